@@ -1,0 +1,20 @@
+include(CMakePackageConfigHelpers)
+
+install(TARGETS KaReportHost KaReport EXPORT KaReportTargets
+        LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR})
+foreach(library KaReportHost KaReport)
+    get_property(headers TARGET ${library} PROPERTY KA_INSTALLED_HEADERS)
+    install(FILES ${headers} DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}/KaReport)
+endforeach()
+install(TARGETS kareport RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR})
+install(FILES LICENSES.md CHANGELOG.md DESTINATION ${CMAKE_INSTALL_DOCDIR})
+install(FILES docs/kareport.1 DESTINATION ${CMAKE_INSTALL_MANDIR}/man1)
+
+set(config_dir ${CMAKE_INSTALL_LIBDIR}/cmake/KaReport)
+install(EXPORT KaReportTargets NAMESPACE KaReport:: DESTINATION ${config_dir})
+configure_package_config_file(cmake/KaReportConfig.cmake.in ${CMAKE_CURRENT_BINARY_DIR}/KaReportConfig.cmake
+                              INSTALL_DESTINATION ${config_dir})
+write_basic_package_version_file(${CMAKE_CURRENT_BINARY_DIR}/KaReportConfigVersion.cmake
+                                 COMPATIBILITY SameMinorVersion)
+install(FILES ${CMAKE_CURRENT_BINARY_DIR}/KaReportConfig.cmake ${CMAKE_CURRENT_BINARY_DIR}/KaReportConfigVersion.cmake
+        DESTINATION ${config_dir})

@@ -1,0 +1,35 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QString>
+
+#include <functional>
+
+/// What a message asks for, and what comes back.
+enum class MessageButtons
+{
+    Ok,
+    YesNoCancel
+};
+enum class MessageAnswer
+{
+    Ok,
+    Yes,
+    No,
+    Cancel
+};
+
+/// Shows a message to the user through the host and waits for the answer. A program that has installed no handler shows
+/// nothing and gets `Cancel`, the answer that loses nothing.
+KAREPORT_EXPORT MessageAnswer AppMessageBox(const QString &text, MessageButtons buttons = MessageButtons::Ok);
+
+namespace kareport
+{
+
+using MessageHandler = std::function<MessageAnswer(const QString &text, MessageButtons buttons)>;
+
+/// Installs what shows messages; an empty handler shows nothing again.
+KAREPORT_EXPORT void setMessageHandler(MessageHandler handler);
+
+} // namespace kareport

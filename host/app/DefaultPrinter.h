@@ -1,0 +1,39 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QString>
+
+namespace kareport
+{
+
+/// Which printer a report's page is measured on.
+enum class PrinterSource
+{
+    SystemOrBuiltIn, ///< the system's default printer, or the built-in page device where there is none
+    BuiltIn,         ///< the built-in page device, the same on every machine
+    None             ///< no printer at all: pages keep the figures they have
+};
+
+/// The sheet of the built-in page device.
+enum class PaperSize
+{
+    ByLocale, ///< Letter where the locale measures in inches, else A4
+    A4,
+    A3,
+    Letter,
+    Legal
+};
+
+/// The printer that the application prints on unless told otherwise.
+struct DefaultPrinter
+{
+    PrinterSource source = PrinterSource::SystemOrBuiltIn;
+    PaperSize paper = PaperSize::ByLocale; ///< of the built-in page device
+    int resolution = 600;                  ///< of the built-in page device, dots per inch
+};
+
+KAREPORT_EXPORT const DefaultPrinter &defaultPrinter();
+KAREPORT_EXPORT void setDefaultPrinter(const DefaultPrinter &printer);
+
+} // namespace kareport

@@ -1,0 +1,21 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QString>
+
+/// The folder of the installed templates. @param reserved  false
+KAREPORT_EXPORT QString GetLibraryDir(bool reserved);
+/// The folder that the host was started in; for the command line, the job file's.
+KAREPORT_EXPORT QString GetStartPathName();
+/// The system's folder for temporary files. @param reserved  false
+KAREPORT_EXPORT QString GetTempDir(bool reserved);
+
+namespace kareport
+{
+
+/// An empty path goes back to the folder that holds without a setting.
+KAREPORT_EXPORT void setLibraryDir(const QString &path);
+KAREPORT_EXPORT void setStartPathName(const QString &path);
+
+} // namespace kareport

@@ -1,0 +1,19 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QString>
+
+/// The font size of new reports in points: the user's preference, 8 when there is none.
+KAREPORT_EXPORT unsigned GetReportFontSize();
+KAREPORT_EXPORT void SetReportFontSize(unsigned points);
+
+/// Whether reports are printed upright; true when the user has not chosen.
+KAREPORT_EXPORT bool IsReportPrinterSetToPortrait();
+KAREPORT_EXPORT void SetReportPrinterToPortrait(bool portrait);
+
+/// Non-zero when the user wants reports in the preferred editor instead of the report view.
+KAREPORT_EXPORT int GetUsePreferredReportEditorFlag();
+KAREPORT_EXPORT void SetUsePreferredReportEditorFlag(bool use);
+/// The name of the profile entry that holds the preferred editor's full path.
+KAREPORT_EXPORT QString GetPreferredReportEditorRegKey();

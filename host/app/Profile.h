@@ -1,0 +1,36 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QString>
+
+#include <memory>
+
+/// The application's profile entry of a name in a section ("" is the application's own), or `fallback` when there is
+/// none.
+KAREPORT_EXPORT QString GetProfileString(const QString &section, const QString &entry,
+                                         const QString &fallback = QString());
+/// Stores a profile entry.
+KAREPORT_EXPORT void WriteProfileString(const QString &section, const QString &entry, const QString &value);
+
+namespace kareport
+{
+
+/// Where profile entries are kept.
+class KAREPORT_EXPORT ProfileStore
+{
+public:
+    virtual ~ProfileStore();
+    virtual QString read(const QString &section, const QString &entry, const QString &fallback) const = 0;
+    virtual void write(const QString &section, const QString &entry, const QString &value) = 0;
+};
+
+/// Entries in the platform's settings store of the application or, with a path, in that file.
+KAREPORT_EXPORT std::unique_ptr<ProfileStore> makeSettingsProfile(const QString &path = QString());
+/// Entries that are forgotten with the process: for programs whose output must not depend on a user's preferences.
+KAREPORT_EXPORT std::unique_ptr<ProfileStore> makeMemoryProfile();
+
+/// The store that the functions above work on; null goes back to the platform's settings store.
+KAREPORT_EXPORT void setProfileStore(std::unique_ptr<ProfileStore> store);
+
+} // namespace kareport

@@ -1,0 +1,9 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QString>
+
+/// The translation of a text in the current language, or the text itself where there is none. What stands behind "@@" is
+/// a note for the translator and is never shown.
+KAREPORT_EXPORT QString Xlate(const char *text);

@@ -1,0 +1,58 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QString>
+#include <QStringList>
+
+#include <memory>
+#include <vector>
+
+class UDocument;
+class UView;
+
+/// A pane of the host's frame that shows views. Open panes are known to the application by their captions.
+class KAREPORT_EXPORT CViewPane
+{
+public:
+    CViewPane();
+    virtual ~CViewPane();
+    CViewPane(const CViewPane &) = delete;
+    CViewPane &operator=(const CViewPane &) = delete;
+
+    /// Takes a view into the pane, which owns it from then on.
+    void AddView(std::unique_ptr<UView> view);
+    const std::vector<std::unique_ptr<UView>> &GetViews() const { return views_; }
+    /// The document of the pane's first view, or null.
+    UDocument *GetActiveDocument() const;
+
+    /// The pane's title without its number.
+    virtual void SetWindowTextW(const QString &text);
+    const QString &GetWindowTextW() const { return text_; }
+    /// What stands on the pane's caption: its title, with ":" and its number when it has one.
+    QString GetCaption() const;
+    /// Shows title and number again after one of them changed.
+    virtual void UpdateTitle();
+
+    /// The number of the pane among those that show the same document: from 1, 0 for an only pane, −1 while panes are
+    /// being counted.
+    int GetWindowNumber() const { return windowNumber_; }
+    void SetWindowNumber(int number) { windowNumber_ = number; }
+
+    virtual bool IsVisible() const { return visible_; }
+    virtual void ShowPane(bool show);
+
+    /// Whether the pane may be closed; asks its document.
+    virtual bool CanClosePane();
+    /// Closes the pane without asking: its views go, and the pane itself with them.
+    virtual void ClosePane();
+
+    /// The captions of all open panes, in the order in which they were opened.
+    static void GetPaneCaptions(QStringList &captions);
+
+private:
+    std::vector<std::unique_ptr<UView>> views_;
+    QString text_;
+    int windowNumber_ = 0;
+    bool visible_ = false;
+};

@@ -1,0 +1,45 @@
+#include "UApplication.h"
+
+namespace
+{
+
+constexpr qsizetype mostRecentFiles = 10;
+
+UApplication *&currentApplication()
+{
+    static UApplication *application = nullptr;
+    return application;
+}
+
+} // namespace
+
+UApplication::UApplication()
+{
+    currentApplication() = this;
+}
+
+UApplication::~UApplication()
+{
+    // Documents that close may still ask for the application.
+    templates_.clear();
+    currentApplication() = nullptr;
+}
+
+UApplication *UApplication::Get()
+{
+    return currentApplication();
+}
+
+UDocTemplate *UApplication::AddDocTemplate(std::unique_ptr<UDocTemplate> docTemplate)
+{
+    return templates_.emplace_back(std::move(docTemplate)).get();
+}
+
+void UApplication::AddToRecentFileList(const QString &path)
+{
+    recentFiles_.removeAll(path);
+    recentFiles_.prepend(path);
+    if (recentFiles_.size() > mostRecentFiles) {
+        recentFiles_.removeLast();
+    }
+}

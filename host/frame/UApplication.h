@@ -1,0 +1,35 @@
+#pragma once
+
+#include "KaReportExport.h"
+#include "UDocTemplate.h"
+
+#include <QStringList>
+
+#include <memory>
+#include <vector>
+
+/// The host application: its document templates and the files last used. There is at most one at a time.
+class KAREPORT_EXPORT UApplication
+{
+public:
+    UApplication();
+    virtual ~UApplication();
+    UApplication(const UApplication &) = delete;
+    UApplication &operator=(const UApplication &) = delete;
+
+    /// The application, or null when there is none.
+    static UApplication *Get();
+
+    /// Takes a template over. @return the template
+    UDocTemplate *AddDocTemplate(std::unique_ptr<UDocTemplate> docTemplate);
+    /// In the order in which they were added.
+    const std::vector<std::unique_ptr<UDocTemplate>> &GetDocTemplates() const { return templates_; }
+
+    /// Puts a file to the front of the list of files last used.
+    virtual void AddToRecentFileList(const QString &path);
+    const QStringList &GetRecentFileList() const { return recentFiles_; }
+
+private:
+    std::vector<std::unique_ptr<UDocTemplate>> templates_;
+    QStringList recentFiles_;
+};

@@ -1,0 +1,100 @@
+#include "UDocTemplate.h"
+
+#include "CViewPane.h"
+#include "UDocument.h"
+#include "UView.h"
+
+#include <algorithm>
+
+UDocTemplate::UDocTemplate(unsigned resourceId, DocumentFactory makeDocument, PaneFactory makePane,
+                           ViewFactory makeView, QString creatorName, int /*savesInFrame*/, int /*reserved*/)
+    : resourceId_(resourceId), makeDocument_(std::move(makeDocument)), makePane_(std::move(makePane)),
+      makeView_(std::move(makeView)), creatorName_(std::move(creatorName))
+{
+}
+
+UDocTemplate::~UDocTemplate()
+{
+    while (!documents_.empty()) {
+        delete documents_.back();
+    }
+}
+
+UDocument *UDocTemplate::OpenReportDocumentFile(const QString &path, int /*addToFrame*/, int makeVisible,
+                                                CViewPane *pane, unsigned style, const QRect *rect)
+{
+    std::unique_ptr<UDocument> made = makeDocument_();
+    if (!made) {
+        return nullptr;
+    }
+    UDocument *document = made.release();
+    document->docTemplate_ = this;
+    documents_.push_back(document);
+
+    const bool ownPane = pane == nullptr;
+    if (ownPane) {
+        pane = CreateNewPane(document, nullptr, style, rect);
+    } else {
+        ShowIn(pane, document);
+    }
+
+    // While it is being filled, the document must not go with a pane that closes.
+    document->SetAutoDelete(false);
+    const bool filled = path.isEmpty() ? document->OnNewDocument() : document->OnOpenDocument(path);
+    if (!filled) {
+        if (pane != nullptr && ownPane) {
+            pane->ClosePane();
+        }
+        delete document;
+        return nullptr;
+    }
+    document->SetAutoDelete(true);
+    if (!path.isEmpty()) {
+        document->SetPathName(path, true);
+    }
+    if (pane != nullptr) {
+        InitialUpdatePane(pane, document, makeVisible);
+    }
+    return document;
+}
+
+CViewPane *UDocTemplate::CreateNewPane(UDocument *document, CViewPane * /*parent*/, unsigned /*style*/,
+                                       const QRect * /*rect*/)
+{
+    if (!makePane_ || !makeView_) {
+        return nullptr;
+    }
+    CViewPane *pane = makePane_();
+    if (pane != nullptr) {
+        ShowIn(pane, document);
+    }
+    return pane;
+}
+
+void UDocTemplate::ShowIn(CViewPane *pane, UDocument *document)
+{
+    std::unique_ptr<UView> view = makeView_ ? makeView_() : nullptr;
+    if (view) {
+        UView *shown = view.get();
+        pane->AddView(std::move(view));
+        document->AddView(shown);
+    }
+}
+
+void UDocTemplate::InitialUpdatePane(CViewPane *pane, UDocument *document, int makeVisible)
+{
+    for (const auto &view : pane->GetViews()) {
+        if (view->GetDocument() == document) {
+            view->OnInitialUpdate();
+        }
+    }
+    if (makeVisible != 0) {
+        pane->ShowPane(true);
+    }
+    document->UpdateFrameCounts();
+}
+
+void UDocTemplate::Forget(UDocument *document)
+{
+    std::erase(documents_, document);
+}

@@ -1,0 +1,219 @@
+#include "UDocument.h"
+
+#include "AppMessageBox.h"
+#include "CViewPane.h"
+#include "UApplication.h"
+#include "UArchive.h"
+#include "UDocTemplate.h"
+#include "UView.h"
+#include "Xlate.h"
+
+#include <QFile>
+#include <QFileInfo>
+#include <QSaveFile>
+
+#include <algorithm>
+
+UDocument::UDocument() = default;
+
+UDocument::~UDocument()
+{
+    for (UView *view : views_) {
+        view->document_ = nullptr;
+    }
+    if (docTemplate_ != nullptr) {
+        docTemplate_->Forget(this);
+    }
+}
+
+void UDocument::SetTitle(const QString &title)
+{
+    title_ = title;
+    for (const UView *view : views_) {
+        if (CViewPane *pane = view->GetParentPane()) {
+            pane->SetWindowTextW(title);
+        }
+    }
+}
+
+void UDocument::SetPathName(const QString &path, bool addToRecentFiles)
+{
+    path_ = path;
+    UDocument::SetTitle(QFileInfo(path).fileName());
+    if (addToRecentFiles && UApplication::Get() != nullptr) {
+        UApplication::Get()->AddToRecentFileList(path);
+    }
+}
+
+void UDocument::AddView(UView *view)
+{
+    view->document_ = this;
+    views_.push_back(view);
+    UpdateFrameCounts();
+}
+
+void UDocument::RemoveView(UView *view)
+{
+    view->document_ = nullptr;
+    std::erase(views_, view);
+    if (views_.empty() && autoDelete_) {
+        OnCloseDocument();
+        return;
+    }
+    UpdateFrameCounts();
+}
+
+void UDocument::UpdateAllViews(UView *sender, long hint, void *hintObject)
+{
+    // A view may close itself or another one while it is updated.
+    const std::vector<UView *> views = views_;
+    for (UView *view : views) {
+        if (view != sender && std::find(views_.begin(), views_.end(), view) != views_.end()) {
+            view->OnUpdate(sender, hint, hintObject);
+        }
+    }
+}
+
+void UDocument::UpdateFrameCounts()
+{
+    for (const UView *view : views_) {
+        if (view->IsVisible()) {
+            view->GetParentPane()->SetWindowNumber(-1);
+        }
+    }
+    std::vector<CViewPane *> panes;
+    for (const UView *view : views_) {
+        if (view->IsVisible() && view->GetParentPane()->GetWindowNumber() == -1) {
+            panes.push_back(view->GetParentPane());
+            panes.back()->SetWindowNumber(static_cast<int>(panes.size()));
+        }
+    }
+    if (panes.size() == 1) {
+        panes.front()->SetWindowNumber(0);
+    }
+    for (CViewPane *pane : panes) {
+        pane->UpdateTitle();
+    }
+}
+
+bool UDocument::OnNewDocument()
+{
+    DeleteContents();
+    path_.clear();
+    SetModifiedFlag(false);
+    OnDocumentEvent(DocumentEvent::AfterNewDocument);
+    return true;
+}
+
+bool UDocument::OnOpenDocument(const QString &path)
+{
+    QFile file(path);
+    if (!file.open(QIODevice::ReadOnly)) {
+        return false;
+    }
+    DeleteContents();
+    SetModifiedFlag(true); // until all of it has been read
+    UArchive archive(file, UArchive::Mode::Loading, QFileInfo(path).absoluteFilePath());
+    Serialize(archive);
+    if (!archive.IsGood()) {
+        DeleteContents();
+        return false;
+    }
+    SetModifiedFlag(false);
+    OnDocumentEvent(DocumentEvent::AfterOpenDocument);
+    return true;
+}
+
+bool UDocument::OnSaveDocument(const QString &path)
+{
+    QSaveFile file(path);
+    if (!file.open(QIODevice::WriteOnly)) {
+        return false;
+    }
+    UArchive archive(file, UArchive::Mode::Storing, QFileInfo(path).absoluteFilePath());
+    Serialize(archive);
+    if (!archive.IsGood() || !file.commit()) {
+        return false;
+    }
+    SetModifiedFlag(false);
+    OnDocumentEvent(DocumentEvent::AfterSaveDocument);
+    return true;
+}
+
+void UDocument::Serialize(UArchive & /*archive*/)
+{
+}
+
+bool UDocument::DoSave(const QString &path, bool replace)
+{
+    if (path.isEmpty() || !OnSaveDocument(path)) {
+        return false;
+    }
+    if (replace) {
+        SetPathName(path, true);
+    }
+    return true;
+}
+
+bool UDocument::DoFileSave()
+{
+    return DoSave(path_, path_.isEmpty());
+}
+
+bool UDocument::SaveModified()
+{
+    if (!IsModified()) {
+        return true;
+    }
+    const QString question = Xlate("Save changes to %1?").arg(title_.isEmpty() ? Xlate("Untitled") : title_);
+    switch (AppMessageBox(question, MessageButtons::YesNoCancel)) {
+    case MessageAnswer::Yes: return DoFileSave();
+    case MessageAnswer::No: return true;
+    default: return false;
+    }
+}
+
+bool UDocument::CanCloseFrame(CViewPane *pane)
+{
+    // Another pane keeps the document.
+    const bool shownElsewhere = std::any_of(views_.begin(), views_.end(), [pane](const UView *view) {
+        return view->GetParentPane() != nullptr && view->GetParentPane() != pane;
+    });
+    return shownElsewhere || SaveModified();
+}
+
+void UDocument::CloseAllPanes()
+{
+    const bool autoDelete = autoDelete_;
+    autoDelete_ = false;
+    while (!views_.empty()) {
+        if (CViewPane *pane = views_.front()->GetParentPane()) {
+            pane->ClosePane();
+        } else {
+            RemoveView(views_.front());
+        }
+    }
+    autoDelete_ = autoDelete;
+}
+
+void UDocument::OnCloseDocument()
+{
+    CloseAllPanes();
+    OnDocumentEvent(DocumentEvent::AfterCloseDocument);
+    DeleteContents();
+    if (autoDelete_) {
+        delete this;
+    }
+}
+
+void UDocument::DeleteContents()
+{
+}
+
+void UDocument::OnDocumentEvent(DocumentEvent /*event*/)
+{
+}
+
+void UDocument::OnReportClosed(UDocument * /*report*/)
+{
+}

@@ -1,0 +1,98 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QString>
+
+#include <vector>
+
+class CViewPane;
+class UArchive;
+class UDocTemplate;
+class UView;
+
+/// A document of the host: its title, file, modified flag and views, and how it is opened, saved and closed.
+///
+/// The document template that made a document owns it. A document deletes itself when it is closed, unless
+/// `SetAutoDelete` has switched that off.
+class KAREPORT_EXPORT UDocument
+{
+public:
+    enum class DocumentEvent
+    {
+        AfterNewDocument,
+        AfterOpenDocument,
+        AfterSaveDocument,
+        AfterCloseDocument
+    };
+
+    UDocument();
+    virtual ~UDocument();
+    UDocument(const UDocument &) = delete;
+    UDocument &operator=(const UDocument &) = delete;
+
+    const QString &GetTitle() const { return title_; }
+    /// Sets the title and the text of every pane that shows the document.
+    virtual void SetTitle(const QString &title);
+    const QString &GetPathName() const { return path_; }
+    /// Sets the file that the document belongs to; its name becomes the title.
+    virtual void SetPathName(const QString &path, bool addToRecentFiles);
+
+    virtual bool IsModified() const { return modified_; }
+    virtual void SetModifiedFlag(bool modified = true) { modified_ = modified; }
+
+    /// Views in the order in which they were added. The panes own them.
+    const std::vector<UView *> &GetViews() const { return views_; }
+    void AddView(UView *view);
+    /// Called by a view that goes. A document whose last view has gone closes, unless auto-delete is off.
+    void RemoveView(UView *view);
+    /// Tells every view but the sender that the document has changed.
+    virtual void UpdateAllViews(UView *sender, long hint = 0, void *hintObject = nullptr);
+    /// Numbers the panes that show the document.
+    virtual void UpdateFrameCounts();
+
+    /// Makes the document an empty, unmodified one without a file. @return false when that is not possible
+    virtual bool OnNewDocument();
+    /// Loads a file through `Serialize`. @return false when it cannot be read; the document is then empty
+    virtual bool OnOpenDocument(const QString &path);
+    /// Stores into a file through `Serialize`, in one step: a failed write leaves an earlier file as it was.
+    virtual bool OnSaveDocument(const QString &path);
+    virtual void Serialize(UArchive &archive);
+    /// Saves under a path and, with `replace`, makes it the document's own.
+    virtual bool DoSave(const QString &path, bool replace);
+    /// Saves under the document's own path.
+    bool DoFileSave();
+
+    /// Asks the user whether to save a modified document. @return false when the closing was cancelled
+    virtual bool SaveModified();
+    /// Whether a pane that shows the document may be closed.
+    virtual bool CanCloseFrame(CViewPane *pane);
+    /// Closes the panes and the document.
+    virtual void OnCloseDocument();
+    virtual void DeleteContents();
+    virtual void OnDocumentEvent(DocumentEvent event);
+    /// Whether the document only serves a search of the shell's; no document of this host does.
+    virtual bool IsSearchAndOrganizeHandler() const { return false; }
+
+    bool IsAutoDelete() const { return autoDelete_; }
+    void SetAutoDelete(bool on) { autoDelete_ = on; }
+
+    /// Tells the document that a report it had asked for has been closed and is about to go.
+    virtual void OnReportClosed(UDocument *report);
+
+    UDocTemplate *GetDocTemplate() const { return docTemplate_; }
+
+protected:
+    /// Closes the panes of all views, without closing the document with the last of them.
+    void CloseAllPanes();
+
+private:
+    friend class UDocTemplate;
+
+    QString title_;
+    QString path_;
+    bool modified_ = false;
+    bool autoDelete_ = true;
+    std::vector<UView *> views_;
+    UDocTemplate *docTemplate_ = nullptr;
+};

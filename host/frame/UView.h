@@ -1,0 +1,34 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+class CViewPane;
+class UDocument;
+
+/// A view of a document, shown in a pane. The pane owns it.
+class KAREPORT_EXPORT UView
+{
+public:
+    UView();
+    virtual ~UView();
+    UView(const UView &) = delete;
+    UView &operator=(const UView &) = delete;
+
+    UDocument *GetDocument() const { return document_; }
+    /// The pane that shows the view; null for a view without one.
+    CViewPane *GetParentPane() const { return pane_; }
+
+    /// Called once when the view and its document are ready: updates the view.
+    virtual void OnInitialUpdate();
+    /// Called when the document has changed. The arguments are those of `UDocument::UpdateAllViews`.
+    virtual void OnUpdate(UView *sender, long hint, void *hintObject);
+    /// Whether the user can see the view.
+    virtual bool IsVisible() const;
+
+private:
+    friend class CViewPane;
+    friend class UDocument;
+
+    UDocument *document_ = nullptr;
+    CViewPane *pane_ = nullptr;
+};

@@ -1,0 +1,114 @@
+#include "FixedNotation.h"
+
+#include <algorithm>
+#include <charconv>
+#include <cmath>
+#include <cstdint>
+
+namespace kareport
+{
+
+namespace
+{
+
+/// Powers of ten that a double holds exactly and whose product with a value can stay below 2^50.
+constexpr std::array<double, 16> powersOfTen = {1e0, 1e1, 1e2,  1e3,  1e4,  1e5,  1e6,  1e7,
+                                                1e8, 1e9, 1e10, 1e11, 1e12, 1e13, 1e14, 1e15};
+constexpr double scalingLimit = 1125899906842624.0; // 2^50: below it a half is held exactly beside the product
+
+/// A double has no more decimals than this; what follows are zeros.
+constexpr int mostExactDecimals = 1074;
+
+constexpr auto digitPairs = [] {
+    std::array<char, 200> pairs{};
+    for (std::size_t i = 0; i < 100; ++i) {
+        pairs[2 * i] = static_cast<char>('0' + i / 10);
+        pairs[2 * i + 1] = static_cast<char>('0' + i % 10);
+    }
+    return pairs;
+}();
+
+/// Writes the last `count` digits of a number before `end`, with leading zeros.
+char *writeDigitsBackwards(char *end, std::uint64_t number, int count)
+{
+    for (; count >= 2; count -= 2) {
+        const auto pair = static_cast<std::size_t>(number % 100) * 2;
+        number /= 100;
+        *--end = digitPairs[pair + 1];
+        *--end = digitPairs[pair];
+    }
+    if (count > 0) {
+        *--end = static_cast<char>('0' + number % 10);
+    }
+    return end;
+}
+
+int countDigits(std::uint64_t number)
+{
+    int count = 1;
+    for (std::uint64_t rest = number; rest >= 10; rest /= 10) {
+        ++count;
+    }
+    return count;
+}
+
+} // namespace
+
+FixedNotation::FixedNotation(double value, int decimals)
+{
+    const double magnitude = std::fabs(value);
+    decimals = std::max(decimals, 0);
+    if (!writeByScaling(magnitude, decimals)) {
+        writeExactly(magnitude, decimals);
+    }
+}
+
+// The value times a power of ten is split into the rounded product and its exact error (a fused multiply-add gives it
+// without rounding). Their sum is the exact product, so the comparison with one half is exact as well, ties included.
+bool FixedNotation::writeByScaling(double magnitude, int decimals)
+{
+    if (decimals >= static_cast<int>(powersOfTen.size())) {
+        return false;
+    }
+    const double power = powersOfTen[static_cast<std::size_t>(decimals)];
+    const double product = magnitude * power;
+    if (!(product < scalingLimit)) {
+        return false;
+    }
+    const double error = std::fma(magnitude, power, -product);
+    auto count = static_cast<std::uint64_t>(product);
+    const double aboveHalf = (product - static_cast<double>(count)) - 0.5;
+    const bool tie = aboveHalf == 0.0 && error == 0.0;
+    if (tie ? count % 2 != 0 : aboveHalf > 0.0 || (aboveHalf == 0.0 && error > 0.0)) {
+        ++count;
+    }
+    zero_ = count == 0;
+
+    char *const end = short_.data() + short_.size();
+    char *begin = end;
+    const auto unit = static_cast<std::uint64_t>(power);
+    std::uint64_t whole = count;
+    if (decimals > 0) {
+        whole = count / unit;
+        begin = writeDigitsBackwards(begin, count - whole * unit, decimals);
+        *--begin = '.';
+    }
+    begin = writeDigitsBackwards(begin, whole, countDigits(whole));
+    size_ = static_cast<std::size_t>(end - begin);
+    std::copy(begin, end, short_.data());
+    return true;
+}
+
+void FixedNotation::writeExactly(double magnitude, int decimals)
+{
+    const int exact = std::min(decimals, mostExactDecimals);
+    // The largest double has 309 digits before its point.
+    long_.resize(static_cast<std::size_t>(310 + 1 + exact));
+    const auto result =
+        std::to_chars(long_.data(), long_.data() + long_.size(), magnitude, std::chars_format::fixed, exact);
+    long_.resize(static_cast<std::size_t>(result.ptr - long_.data()));
+    long_.append(static_cast<std::size_t>(decimals - exact), '0');
+    zero_ = long_.find_first_not_of("0.") == std::string::npos;
+}
+
+} // namespace kareport

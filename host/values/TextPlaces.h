@@ -1,0 +1,34 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QStringView>
+
+#include <vector>
+
+namespace kareport
+{
+
+/// A place in a text, both counted from 1.
+struct TextPlace
+{
+    qsizetype line = 1;
+    qsizetype column = 1; ///< in characters: a surrogate pair is one
+};
+
+/// Finds the places of positions in a text whose lines end with LF. The text must live as long as this object.
+class KAREPORT_EXPORT TextPlaces
+{
+public:
+    explicit TextPlaces(QStringView text);
+
+    /// The place of the character at a position; behind the end, the place of the end.
+    TextPlace of(qsizetype position) const;
+
+private:
+    QStringView text_;
+    std::vector<qsizetype> lineStarts_;
+    bool hasSurrogates_;
+};
+
+} // namespace kareport

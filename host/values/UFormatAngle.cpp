@@ -1,0 +1,20 @@
+#include "UFormatAngle.h"
+
+void UFormatAngle::ConvertToDMSformatString(char degreeMark, char minuteMark, char secondMark, QString &text)
+{
+    qsizetype kept = 0;
+    QChar *const characters = text.data();
+    for (qsizetype i = 0; i < text.size(); ++i) {
+        char mark = 0;
+        switch (characters[i].unicode()) {
+        case u'°': mark = degreeMark; break;
+        case u'\'': mark = minuteMark; break;
+        case u'"': mark = secondMark; break;
+        default: characters[kept++] = characters[i]; continue;
+        }
+        if (mark != 0) {
+            characters[kept++] = QLatin1Char(mark);
+        }
+    }
+    text.truncate(kept);
+}

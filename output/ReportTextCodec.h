@@ -1,0 +1,41 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QStringView>
+
+#include <cstddef>
+
+namespace kareport
+{
+
+/// How line feeds are written.
+enum class LineEnds
+{
+    ReportFile, ///< LF as CR LF; a line of a report, which ends with CR LF already, then ends with CR CR LF
+    PlainText   ///< CR LF as LF, every other character as it is
+};
+
+/// Turns report text into UTF-8, piece by piece and in the order of the text.
+class KAREPORT_EXPORT ReportTextEncoder
+{
+public:
+    explicit ReportTextEncoder(LineEnds lineEnds) : lineEnds_(lineEnds) {}
+
+    /// The most bytes that a piece of text, and what was held back of the piece before, can become.
+    static std::size_t bound(std::size_t characters) { return 3 * (characters + 1); }
+    /// Writes the UTF-8 of a piece of text.
+    /// @param out  room for `bound(text.size())` bytes
+    /// @param last  the text ends here; otherwise a last CR or high surrogate is held back for the next piece
+    /// @return the bytes written. A surrogate without its other half becomes U+FFFD.
+    std::size_t encode(QStringView text, char *out, bool last);
+
+private:
+    LineEnds lineEnds_;
+    char16_t heldBack_ = 0;
+};
+
+/// The bytes that a report file begins with: the UTF-8 byte-order mark.
+inline constexpr char reportFileMark[] = {'\xEF', '\xBB', '\xBF'};
+
+} // namespace kareport

@@ -1,0 +1,152 @@
+#include "DataWriter.h"
+
+namespace kareport
+{
+
+namespace
+{
+
+/// A heading of a table needs this many lines and one more for a row.
+constexpr int headingRoom = 3;
+constexpr int usualHeadingLinesAfter = 2;
+
+const PageHeading noHeading = {QString(), 0, usualHeadingLinesAfter};
+
+template <typename Handle>
+std::vector<FieldFormatter> formattersOf(const Handle &handle)
+{
+    std::vector<FieldFormatter> fields;
+    fields.reserve(static_cast<std::size_t>(handle.GetFieldsCount()));
+    for (int i = 0; i < handle.GetFieldsCount(); ++i) {
+        fields.emplace_back(handle.GetField(i));
+    }
+    return fields;
+}
+
+} // namespace
+
+QString withChainageLabel(QString heading, const QString &label)
+{
+    const QString word = heading.contains(u"Chainage") ? QStringLiteral("Chainage") : QStringLiteral("Station");
+    return heading.replace(word, label);
+}
+
+void DataWriter::writeBlock(const UXmlReportBlock &block, const UDataObject &object, int linesBefore, int linesAfter)
+{
+    if (!page_.newPage(linesBefore)) {
+        page_.lineFeed(linesBefore);
+    }
+    for (int i = 0; i < block.GetFieldsCount(); ++i) {
+        const sXmlReportField field = block.GetField(i);
+        const FieldFormatter formatter(field);
+        const UDictEntry *entry = object.Find(formatter.id());
+        if (entry == nullptr) {
+            continue;
+        }
+        row_.clear();
+        row_.append(field.Label);
+        row_.append(options_.separator);
+        const std::size_t start = row_.size();
+        formatter.append(row_, options_, entry->GetKind(), entry->GetData(), QStringView());
+        row_.trim(start);
+        page_.writeLine(row_.view(), 0, 1, 0);
+    }
+    endOutput(linesAfter);
+}
+
+void DataWriter::writeTable(const UXmlReportTable &table, UDataObjectList &list, const TableLayout &layout)
+{
+    if (!page_.newPage(layout.linesBefore)) {
+        page_.lineFeed(layout.linesBefore);
+    }
+    std::vector<quint32> sortIds;
+    table.GetSortList(sortIds);
+    if (!sortIds.empty()) {
+        list.Sort(sortIds);
+    }
+    const int linesAfter = layout.headingLinesAfter == -1 ? usualHeadingLinesAfter : layout.headingLinesAfter;
+    page_.setHeading({withChainageLabel(table.GetHeading(), layout.chainageLabel), 0, linesAfter});
+    if (!page_.heading().text.isEmpty()) {
+        placeHeading(table, layout.writeName);
+    }
+    writeRows(table, list);
+    endOutput(layout.linesAfter);
+}
+
+/// At a page's start the header brings the heading with it. Without headers the heading is then not written at all,
+/// which hosts that lay out their own pages count on.
+void DataWriter::placeHeading(const UXmlReportTable &table, bool writeName)
+{
+    if (page_.lineCount() == 0) {
+        page_.beginFirstPage();
+        return;
+    }
+    if (page_.linesLeft() <= headingRoom) {
+        page_.breakPage();
+        return;
+    }
+    if (writeName) {
+        page_.lineFeed(1);
+        page_.writeLine(table.GetTableName(), 0, 1, 0);
+        page_.lineFeed(1);
+    }
+    page_.writeHeading();
+}
+
+void DataWriter::writeRows(const UXmlReportTable &table, UDataObjectList &list)
+{
+    const std::vector<FieldFormatter> fields = formattersOf(table);
+    const UDataObject *object = list.GetAt(0);
+    for (std::size_t index = 1; object != nullptr; ++index) {
+        // The row is complete before the next object is asked for: a list may hold one object at a time.
+        formatRow(fields, *object);
+        object = list.GetAt(index);
+        if (object != nullptr) {
+            page_.writeLine(row_.view(), 0, 1, 0);
+            continue;
+        }
+        // The last line end may turn the page: without a heading it does not begin with one over no rows.
+        page_.newPage(0);
+        page_.write(row_.view(), 0);
+        page_.noteChange();
+        page_.setHeading(noHeading);
+        page_.writeLine(QStringView(), 0, 1, 0);
+    }
+}
+
+void DataWriter::formatRow(const std::vector<FieldFormatter> &fields, const UDataObject &object)
+{
+    row_.clear();
+    QStringView suffix;
+    for (const FieldFormatter &field : fields) {
+        switch (field.marker()) {
+        case FieldMarker::SuffixR: suffix = u"R"; continue;
+        case FieldMarker::SuffixPlus: suffix = u"+"; continue;
+        case FieldMarker::Filler: field.append(row_, options_, 0, nullptr, suffix); break;
+        case FieldMarker::None: {
+            const UDictEntry *entry = object.Find(field.id());
+            if (entry != nullptr) {
+                field.append(row_, options_, entry->GetKind(), entry->GetData(), suffix);
+            } else {
+                field.append(row_, options_, 0, nullptr, suffix);
+            }
+            row_.append(options_.separator);
+            break;
+        }
+        }
+        suffix = QStringView();
+    }
+    if (row_.size() > 0 && row_.view().back() == QChar(options_.separator)) {
+        row_.truncate(row_.size() - 1);
+    }
+}
+
+void DataWriter::endOutput(int linesAfter)
+{
+    page_.setHeading(noHeading);
+    if (!page_.newPage(linesAfter)) {
+        page_.lineFeed(linesAfter);
+    }
+}
+
+} // namespace kareport

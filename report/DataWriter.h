@@ -1,0 +1,47 @@
+#pragma once
+
+#include "FieldFormatter.h"
+#include "PageWriter.h"
+#include "UDataObjectList.h"
+#include "UXmlReportBlock.h"
+#include "UXmlReportTable.h"
+
+#include <QString>
+
+namespace kareport
+{
+
+/// Writes data objects through a template: one object as a block, a list of them as a table.
+class DataWriter
+{
+public:
+    DataWriter(PageWriter &page, const FormatOptions &options) : page_(page), options_(options) {}
+
+    void writeBlock(const UXmlReportBlock &block, const UDataObject &object, int linesBefore, int linesAfter);
+
+    struct TableLayout
+    {
+        int linesBefore = 0;
+        int linesAfter = 0;
+        int headingLinesAfter = -1; ///< -1 for the usual 2
+        QString chainageLabel;
+        bool writeName = false; ///< the table's name over its heading
+    };
+    void writeTable(const UXmlReportTable &table, UDataObjectList &list, const TableLayout &layout);
+
+private:
+    void placeHeading(const UXmlReportTable &table, bool writeName);
+    void writeRows(const UXmlReportTable &table, UDataObjectList &list);
+    void formatRow(const std::vector<FieldFormatter> &fields, const UDataObject &object);
+    void endOutput(int linesAfter);
+
+    PageWriter &page_;
+    const FormatOptions &options_;
+    TextBuffer row_;
+};
+
+/// A table's heading with the chainage column's own label: it replaces every "Chainage" or, where there is none, every
+/// "Station".
+QString withChainageLabel(QString heading, const QString &label);
+
+} // namespace kareport

@@ -1,0 +1,97 @@
+#include "PageMeasurement.h"
+
+#include "DefaultPrinter.h"
+
+#include <QFont>
+#include <QFontMetricsF>
+#include <QLocale>
+#include <QPageLayout>
+#include <QPageSize>
+#include <QPrinter>
+#include <QPrinterInfo>
+
+#include <cmath>
+
+namespace kareport
+{
+
+namespace
+{
+
+constexpr int hundredthsPerInch = 2540; // of a millimetre
+constexpr int pointsPerInch = 72;
+constexpr qsizetype longestFaceName = 31;
+
+QPageSize::PageSizeId sheetOf(PaperSize paper)
+{
+    switch (paper) {
+    case PaperSize::A4: return QPageSize::A4;
+    case PaperSize::A3: return QPageSize::A3;
+    case PaperSize::Letter: return QPageSize::Letter;
+    case PaperSize::Legal: return QPageSize::Legal;
+    case PaperSize::ByLocale: break;
+    }
+    return QLocale::system().measurementSystem() == QLocale::ImperialUSSystem ? QPageSize::Letter : QPageSize::A4;
+}
+
+PageDevice builtInDevice(bool portrait)
+{
+    const DefaultPrinter &printer = defaultPrinter();
+    const QSize upright = QPageSize(sheetOf(printer.paper)).sizePixels(printer.resolution);
+    return {portrait ? upright : upright.transposed(), printer.resolution};
+}
+
+PageDevice printerDevice(const QPrinterInfo &info, bool portrait)
+{
+    QPrinter printer(info, QPrinter::HighResolution);
+    printer.setPageOrientation(portrait ? QPageLayout::Portrait : QPageLayout::Landscape);
+    return {printer.pageLayout().fullRectPixels(printer.resolution()).size(), printer.resolution()};
+}
+
+} // namespace
+
+int mulDiv(int a, int b, int c)
+{
+    const qint64 product = qint64(a) * b;
+    const qint64 half = c / 2;
+    return static_cast<int>((product < 0 ? product - half : product + half) / c);
+}
+
+PageGeometry measurePage(const PageDevice &device, const QMargins &margins, const FontExtents &font)
+{
+    const auto dots = [&](int margin) { return mulDiv(margin, device.resolution, hundredthsPerInch); };
+    PageGeometry geometry;
+    geometry.pageSize = device.size;
+    geometry.resolution = static_cast<unsigned>(device.resolution);
+    geometry.linesPerPage = (device.size.height() - dots(margins.bottom()) - dots(margins.top())) /
+                            (font.height + font.externalLeading);
+    geometry.charsPerRow = (device.size.width() - dots(margins.right()) - dots(margins.left())) / font.averageWidth;
+    return geometry;
+}
+
+std::optional<PageDevice> defaultPageDevice(bool portrait)
+{
+    switch (defaultPrinter().source) {
+    case PrinterSource::None: return std::nullopt;
+    case PrinterSource::BuiltIn: return builtInDevice(portrait);
+    case PrinterSource::SystemOrBuiltIn: break;
+    }
+    const QPrinterInfo info = QPrinterInfo::defaultPrinter();
+    return info.isNull() ? builtInDevice(portrait) : printerDevice(info, portrait);
+}
+
+FontExtents measureFont(const QString &face, unsigned points, int resolution)
+{
+    QFont font;
+    font.setFamilies({face.left(longestFaceName), QStringLiteral("DejaVu Sans Mono")});
+    font.setStyleHint(QFont::TypeWriter);
+    font.setFixedPitch(true);
+    font.setHintingPreference(QFont::PreferNoHinting);
+    font.setPixelSize(mulDiv(static_cast<int>(points), resolution, pointsPerInch));
+    const QFontMetricsF metrics(font);
+    const auto rounded = [](qreal dots) { return static_cast<int>(std::lround(dots)); };
+    return {rounded(metrics.ascent()) + rounded(metrics.descent()), rounded(metrics.leading()),
+            rounded(metrics.averageCharWidth())};
+}
+
+} // namespace kareport

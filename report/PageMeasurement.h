@@ -1,0 +1,52 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QMargins>
+#include <QSize>
+#include <QString>
+
+#include <optional>
+
+namespace kareport
+{
+
+/// The sheet that a printer prints on.
+struct PageDevice
+{
+    QSize size;         ///< whole sheet, printer dots
+    int resolution = 0; ///< vertical dots per inch
+};
+
+/// A font as a printer has it, in printer dots.
+struct FontExtents
+{
+    int height = 0;          ///< ascent and descent
+    int externalLeading = 0; ///< between two lines
+    int averageWidth = 0;    ///< of a character
+};
+
+/// Printed page of a report, measured once from a printer and a font.
+struct PageGeometry
+{
+    QSize pageSize;          ///< whole sheet, printer dots; (0, 0) until measured
+    unsigned resolution = 0; ///< vertical dots per inch; 0 until measured
+    int linesPerPage = 72;   ///< lines between the margins
+    int charsPerRow = 80;    ///< characters of average width between the margins
+};
+
+/// a × b / c, rounded to the nearest whole number, halves away from 0.
+KAREPORT_EXPORT int mulDiv(int a, int b, int c);
+
+/// How many lines and characters fit between the margins (hundredths of a millimetre). The whole sheet counts, not its
+/// printable part.
+KAREPORT_EXPORT PageGeometry measurePage(const PageDevice &device, const QMargins &margins, const FontExtents &font);
+
+/// The application's default printer, upright or not; nothing when there is none.
+KAREPORT_EXPORT std::optional<PageDevice> defaultPageDevice(bool portrait);
+
+/// The extents of a fixed-pitch face at a size in points on a device. A face that is not installed is replaced by the
+/// nearest fixed-pitch face. Needs a running QGuiApplication.
+KAREPORT_EXPORT FontExtents measureFont(const QString &face, unsigned points, int resolution);
+
+} // namespace kareport

@@ -1,0 +1,138 @@
+#include "PageWriter.h"
+
+#include <algorithm>
+
+namespace kareport
+{
+
+namespace
+{
+
+int countLineFeeds(QStringView text)
+{
+    return static_cast<int>(std::count(text.utf16(), text.utf16() + text.size(), u'\n'));
+}
+
+} // namespace
+
+PageWriterObserver::~PageWriterObserver() = default;
+
+PageWriter::PageWriter(PageWriterObserver *observer, ReportText::Reallocate reallocate)
+    : observer_(observer), text_(reallocate)
+{
+}
+
+void PageWriter::clear()
+{
+    text_.clear();
+    lineCount_ = 0;
+    heading_.text.clear();
+    noteChange();
+}
+
+bool PageWriter::write(QStringView text, int style)
+{
+    if (!text_.append(text)) {
+        return false;
+    }
+    const int lineFeeds = countLineFeeds(text);
+    lineNumber_ += lineFeeds;
+    lineCount_ += lineFeeds;
+    if (observer_ != nullptr && !text.isEmpty()) {
+        observer_->textWritten(text, style);
+    }
+    return true;
+}
+
+void PageWriter::lineFeed(int count)
+{
+    for (int i = 0; i < count; ++i) {
+        if (!text_.appendLineEnd()) {
+            return;
+        }
+        if (observer_ != nullptr) {
+            observer_->lineEnded();
+        }
+        ++lineNumber_;
+        ++lineCount_;
+    }
+}
+
+void PageWriter::beginFirstPage()
+{
+    pageNumber_ = 1;
+    lineNumber_ = 1;
+    if (headerFlag_) {
+        writeHeader();
+    }
+}
+
+void PageWriter::breakPage()
+{
+    lineFeed(linesLeft() + 1);
+    ++pageNumber_;
+    lineNumber_ = 1;
+    if (headerFlag_) {
+        writeHeader();
+    }
+}
+
+bool PageWriter::newPage(int linesNeeded)
+{
+    if (lineCount_ == 0) {
+        beginFirstPage();
+        return true;
+    }
+    const int remaining = linesLeft();
+    if (remaining != 0 && linesNeeded >= 0 && linesNeeded < remaining) {
+        return false;
+    }
+    breakPage();
+    return true;
+}
+
+void PageWriter::writeLine(QStringView text, int linesBefore, int linesAfter, int style)
+{
+    if (!newPage(linesBefore)) {
+        lineFeed(linesBefore);
+    }
+    write(text, style);
+    if (linesAfter != 0) {
+        lineFeed(1);
+        if (!newPage(linesAfter - 1)) {
+            lineFeed(linesAfter - 1);
+        }
+    }
+    noteChange();
+}
+
+void PageWriter::writeHeading()
+{
+    lineFeed(heading_.linesBefore);
+    write(heading_.text, 0);
+    lineFeed(heading_.linesAfter);
+    noteChange();
+}
+
+void PageWriter::writeHeader()
+{
+    // Counted here and once more when the heading is written: a heading of several lines reserves a spare line for each
+    // of its line breaks. Page layouts in use are tuned to it.
+    const int lineFeeds = countLineFeeds(heading_.text);
+    lineNumber_ += lineFeeds;
+    lineCount_ += lineFeeds;
+    write(headerLine_ + QStringLiteral("%1").arg(pageNumber_, 3), 0);
+    lineFeed(heading_.linesBefore + headerGap);
+    write(heading_.text, 0);
+    lineFeed(heading_.linesAfter);
+    noteChange();
+}
+
+void PageWriter::noteChange()
+{
+    if (observer_ != nullptr) {
+        observer_->changed();
+    }
+}
+
+} // namespace kareport

@@ -1,0 +1,95 @@
+#pragma once
+
+#include "KaReportExport.h"
+#include "ReportText.h"
+
+#include <QString>
+#include <QStringView>
+
+namespace kareport
+{
+
+/// Is told what is written, piece by piece.
+class KAREPORT_EXPORT PageWriterObserver
+{
+public:
+    virtual ~PageWriterObserver();
+    /// A piece of text, never empty, with the style it was written in.
+    virtual void textWritten(QStringView text, int style) = 0;
+    /// A line end that is no part of a piece.
+    virtual void lineEnded() = 0;
+    /// A line, a heading or a page header was written.
+    virtual void changed() = 0;
+};
+
+/// The repeated lines at a page's start.
+struct PageHeading
+{
+    QString text;
+    int linesBefore = 0;
+    int linesAfter = 0;
+};
+
+/// Lays text out in pages and lines: the counters, the page rule, the header and the heading of every page.
+class KAREPORT_EXPORT PageWriter
+{
+public:
+    /// The observer may be null; otherwise it must live as long as the writer.
+    explicit PageWriter(PageWriterObserver *observer = nullptr, ReportText::Reallocate reallocate = nullptr);
+
+    ReportText &text() { return text_; }
+    const ReportText &text() const { return text_; }
+
+    int lineNumber() const { return lineNumber_; } ///< line on the page; 1 right after a page break
+    int lineCount() const { return lineCount_; }   ///< lines since the last `clear`; 0: nothing has been written
+    int pageNumber() const { return pageNumber_; } ///< from 1
+
+    int linesPerPage() const { return linesPerPage_; }
+    void setLinesPerPage(int lines) { linesPerPage_ = lines; }
+    void setHeaderFlag(bool on) { headerFlag_ = on; }
+    bool headerFlag() const { return headerFlag_; }
+    /// The header line without its page number, which every page adds.
+    void setHeaderLine(const QString &line) { headerLine_ = line; }
+    const QString &headerLine() const { return headerLine_; }
+    void setHeading(PageHeading heading) { heading_ = std::move(heading); }
+    const PageHeading &heading() const { return heading_; }
+
+    /// Empties the text and the heading. Line and page number stay until the next `newPage` starts them again.
+    void clear();
+    /// Appends text as it is, counting its line feeds. @return false, changing nothing, when there is no room
+    bool write(QStringView text, int style);
+    /// Ends the line so many times; stops where there is no room.
+    void lineFeed(int count);
+    /// Starts a new page when so many lines and one more do not fit, always for a number below 0.
+    /// @return whether it did
+    bool newPage(int linesNeeded);
+    /// Writes a line: blank lines before it (dropped at a page's start), the text, line ends after it. With 0 after, the
+    /// line stays open.
+    void writeLine(QStringView text, int linesBefore, int linesAfter, int style);
+    /// Ends the page without looking at what is left of it, and begins the next one.
+    void breakPage();
+    /// What `newPage` does before anything is written.
+    void beginFirstPage();
+    int linesLeft() const { return linesPerPage_ - lineNumber_; }
+    void writeHeading();
+    void writeHeader();
+    /// Tells the observer that something was changed.
+    void noteChange();
+    /// One more line than the text's line ends say, for a reader that gives lines without counting them.
+    void countLine() { ++lineCount_; }
+
+private:
+    static constexpr int headerGap = 4; ///< line ends behind the header line
+
+    PageWriterObserver *observer_;
+    ReportText text_;
+    int lineNumber_ = 0;
+    int lineCount_ = 0;
+    int pageNumber_ = 0;
+    int linesPerPage_ = 72;
+    bool headerFlag_ = false;
+    QString headerLine_;
+    PageHeading heading_;
+};
+
+} // namespace kareport

@@ -1,0 +1,77 @@
+#include "ReportEntry.h"
+
+#include "Preferences.h"
+#include "Profile.h"
+#include "ReportViewPort.h"
+#include "ReportWindow.h"
+#include "UApplication.h"
+#include "UReportDoc.h"
+
+#include <QFileInfo>
+
+namespace
+{
+
+constexpr unsigned reportResourceId = 27006;
+const QString creatorName = QStringLiteral("REPORTDOCTEMPLATE");
+
+} // namespace
+
+kareport::ReportWindow::~ReportWindow() = default;
+kareport::ReportViewPort::~ReportViewPort() = default;
+
+void LoadKaReport()
+{
+}
+
+std::unique_ptr<UDocTemplate> ReportInitialTemplate(UDocTemplate::PaneFactory makePane,
+                                                    UDocTemplate::ViewFactory makeView)
+{
+    return std::make_unique<UDocTemplate>(
+        reportResourceId, [] { return std::make_unique<UReportDoc>(); }, std::move(makePane), std::move(makeView),
+        creatorName, 1, 1);
+}
+
+UDocTemplate *GetReportTemplate()
+{
+    if (UApplication::Get() == nullptr) {
+        return nullptr;
+    }
+    for (const auto &docTemplate : UApplication::Get()->GetDocTemplates()) {
+        if (docTemplate->IsThatCreator(creatorName)) {
+            return docTemplate.get();
+        }
+    }
+    return nullptr;
+}
+
+UReportDoc *CreateReport(const QString &name, bool headerFlag, bool externalEditor, CViewPane *pane, unsigned style,
+                         const QRect *rect)
+{
+    UDocTemplate *reportTemplate = GetReportTemplate();
+    const int show = IsUseExternalEditor(externalEditor) ? 0 : 1;
+    if (reportTemplate == nullptr) {
+        return nullptr;
+    }
+    auto *report = static_cast<UReportDoc *>(
+        reportTemplate->OpenReportDocumentFile(QString(), show, show, pane, style, rect));
+    if (report == nullptr) {
+        return nullptr;
+    }
+    if (!name.isNull()) {
+        report->SetTitle(name);
+        report->SetReportFileName(name);
+    }
+    report->SetHeaderFlag(headerFlag);
+    report->SetExternalEditorFlag(externalEditor);
+    return report;
+}
+
+bool IsUseExternalEditor(bool want)
+{
+    if (!want || GetUsePreferredReportEditorFlag() == 0) {
+        return false;
+    }
+    const QString editor = GetProfileString(QString(), GetPreferredReportEditorRegKey());
+    return !editor.isEmpty() && QFileInfo::exists(editor);
+}

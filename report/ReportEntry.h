@@ -1,0 +1,38 @@
+#pragma once
+
+#include "KaReportExport.h"
+#include "UDocTemplate.h"
+
+#include <QRect>
+#include <QString>
+
+#include <memory>
+
+class CViewPane;
+class UReportDoc;
+
+/// Makes sure that the module is loaded; does nothing else.
+KAREPORT_EXPORT void LoadKaReport();
+
+/// A new document template for reports, which the host adds to its application. With no pane and view given, reports are
+/// made without windows.
+KAREPORT_EXPORT std::unique_ptr<UDocTemplate>
+ReportInitialTemplate(UDocTemplate::PaneFactory makePane = {}, UDocTemplate::ViewFactory makeView = {});
+
+/// The application's document template for reports; null when there is no application or no such template.
+KAREPORT_EXPORT UDocTemplate *GetReportTemplate();
+
+/// Makes an empty report.
+/// @param name            its title and file name; a null text for none
+/// @param headerFlag      whether every page begins with header and heading
+/// @param externalEditor  whether it is meant for the user's preferred editor; if it is and there is one, the report's
+///                        own pane is not shown
+/// @param pane            the pane that shows it; null for a new one
+/// @param style, rect     window style and place of a new pane; rect may be null
+/// @return the report, owned by its document template; null when there is no template or no document can be made
+KAREPORT_EXPORT UReportDoc *CreateReport(const QString &name, bool headerFlag, bool externalEditor, CViewPane *pane,
+                                         unsigned style, const QRect *rect);
+
+/// Whether a report that wants the user's preferred editor gets it: one is chosen, preferred and installed. Looks the
+/// preferences up each time.
+KAREPORT_EXPORT bool IsUseExternalEditor(bool want);

@@ -1,0 +1,251 @@
+#pragma once
+
+#include "KaReportExport.h"
+#include "PageMeasurement.h"
+#include "PageWriter.h"
+#include "UDataObjectList.h"
+#include "UDocument.h"
+#include "UJobSettings.h"
+#include "UXmlReportBlock.h"
+#include "UXmlReportTable.h"
+#include "UXmlReportTpl.h"
+
+#include <QHash>
+#include <QMargins>
+#include <QSize>
+#include <QString>
+
+#include <memory>
+#include <optional>
+
+class CViewPane;
+
+namespace kareport
+{
+class ReportWindow;
+struct FormatOptions;
+} // namespace kareport
+
+/// A report: fixed-pitch text laid out in pages and lines, written by host code or through a template.
+///
+/// Reports are made through their document template (`CreateReport`), which owns them. Functions answer false or 0 when
+/// they cannot do what they are asked, and never throw. Every function that writes text sets the modified flag.
+class KAREPORT_EXPORT UReportDoc : public UDocument, private kareport::PageWriterObserver
+{
+public:
+    /// @param name            title and report file name; a null text for none
+    /// @param externalEditor  meant for the user's preferred editor
+    /// @param closeDocument   closes as soon as its content has been handed to an editor
+    /// @param owner           the host document that asked for the report, told when it goes; null for none, not owned
+    UReportDoc(const QString &name, bool externalEditor, bool closeDocument, UDocument *owner);
+    UReportDoc();
+    ~UReportDoc() override;
+
+    /// Whether a pointer is a report that is still alive.
+    static bool IsReportAvailable(const UReportDoc *report);
+
+    // --- Text -------------------------------------------------------------------------------------------------------
+
+    /// The report text, lines ended by CR LF, with a 0 behind it; valid until the next write.
+    const char16_t *GetData() const { return page_.text().data(); }
+    /// The same with its length, for texts that hold a character 0.
+    QStringView GetText() const { return page_.text().view(); }
+    /// Replaces the text as it is. Counters stay, so what is written next continues the old pages.
+    void SetData(const QString &text);
+    /// Empties the report. The next line written begins page 1.
+    virtual void Clear();
+    /// Makes room for so many characters. @return 0 when there is no memory for them
+    int CheckSize(int required);
+
+    /// Appends text as it is. @param style  handed on to the rich text: 0 plain, 1 bold, 2 underlined, 3 both
+    /// @return false, with nothing written, when there is no memory
+    bool Write(const QString &text, int style);
+    /// Ends the current line `count` times; nothing for 0 or less.
+    void LineFeed(int count);
+    /// Starts a new page when the page has no room for more than `linesNeeded` lines, and always for a number below 0.
+    /// @return whether it did
+    bool NewPage(int linesNeeded);
+    /// Writes a line: blank lines before it (dropped where a page begins), the text, and line ends after it; 0 after
+    /// leaves the line open. Below 0 before forces a new page.
+    void WriteLine(const QString &text, int linesBefore, int linesAfter, int style);
+
+    /// Sets the text that repeats under the header of every page.
+    void SetHeading(const QString &heading, int linesBefore, int linesAfter);
+    /// Writes the heading where the report is; does not look for a page's end.
+    void WriteHeading();
+    /// Builds the header line anew from application, title and the time of now.
+    void SetHeader();
+    void WriteHeader();
+    void SetHeaderFlag(bool on) { page_.setHeaderFlag(on); }
+    bool GetHeaderFlag() const { return page_.headerFlag(); }
+
+    // --- Page -------------------------------------------------------------------------------------------------------
+
+    /// Measures the page on the default printer. @return 1, or 0 without a printer: the figures then stay as they were
+    int SetPageSize();
+    /// Fixes the lines of a page or the characters of a row, whatever the printer says; with both, no printer is asked.
+    /// Figures are 1 or more.
+    void FixPage(std::optional<int> linesPerPage, std::optional<int> charsPerRow);
+    int GetLinesPerPage() const { return page_.linesPerPage(); }
+    int GetCharsPerRow() const { return geometry_.charsPerRow; }
+    int GetLineCount() const { return page_.lineCount(); }   ///< 0: nothing has been written yet
+    int GetLineNumber() const { return page_.lineNumber(); } ///< on the page, from 1
+    int GetPageNumber() const { return page_.pageNumber(); } ///< from 1
+    unsigned GetPrintResolution() const { return geometry_.resolution; } ///< vertical dots per inch; 0: not measured
+    QSize GetPageSize() const { return geometry_.pageSize; }             ///< whole sheet in printer dots
+    unsigned GetFontSize() const { return fontSize_; }                   ///< points
+    void SetFontSize(unsigned points) { fontSize_ = points; }            ///< does not measure again
+    QString GetFontName() const { return fontName_; }
+    void SetFontName(const QString &name) { fontName_ = name; } ///< does not measure again
+    /// Hundredths of a millimetre.
+    QMargins GetMargins() const { return margins_; }
+    /// Stores the margins; `SaveSettings` keeps them for later reports and `SetPageSize` measures with them.
+    void SetMargins(const QMargins &margins) { margins_ = margins; }
+    /// Reads the margins and the font size from the user's preferences.
+    void LoadSettings();
+    /// Writes the margins to the user's preferences.
+    void SaveSettings();
+
+    // --- Templates and data -----------------------------------------------------------------------------------------
+
+    /// Loads a template from a file of the library folder or, failing that, of the start folder, and with it a table
+    /// and a block unless their names are empty. Takes over the template's separator, page breaks and title.
+    bool LoadTemplateXml(const QString &fileName, const QString &templateName, const QString &tableName,
+                         const QString &blockName);
+    bool LoadTemplateTable(const QString &tableName);
+    bool LoadTemplateBlock(const QString &blockName);
+    /// The loaded template, or null.
+    const UXmlReportTpl *GetTemplate() const { return template_.get(); }
+
+    /// The text of a value, fitted to its field. @param kind  what `value` points to: 1 a bool, 2 a qint16, 4 a qint32,
+    /// 8 a double in internal units, 16 a QString, 32 a UPointNumber; any other, or null, for no value
+    /// @param offsetStyle  "+" shows an offset with its sign
+    QString FormatXmlStringToDisplay(const sXmlReportField *field, int kind, const void *value,
+                                     const QString &offsetStyle) const;
+
+    /// Writes an object through the loaded block: a line for each field that the object has a value for.
+    /// @return false, with nothing written, when no block is loaded
+    bool WriteDataBlock(const UDataObject *object, int linesBefore, int linesAfter);
+    bool WriteDataBlock(const QString &blockName, const UDataObject *object, int linesBefore, int linesAfter);
+    /// Writes a list through the loaded table: heading, then a line for each object, sorted if the table says so.
+    /// @param headingLinesAfter  line ends behind the heading; -1 for 2
+    /// @return false, with nothing written, when no table is loaded
+    bool WriteDataTable(UDataObjectList *list, int linesBefore, int linesAfter, int headingLinesAfter);
+    bool WriteDataTable(const QString &tableName, UDataObjectList *list, int linesBefore, int linesAfter,
+                        int headingLinesAfter);
+
+    void SetJobSettings(const UJobSettings &settings) { settings_ = settings; }
+    const UJobSettings &GetJobSettings() const { return settings_; }
+    /// Replaces the caption of the chainage column in table headings.
+    void SetChainageLabel(const QString &label) { chainageLabel_ = label; }
+    /// The character between columns; `raw` takes the character 255 instead.
+    void SetDataColumnSeparator(char16_t separator, bool raw);
+    char16_t GetDataColumnSeparator() const { return separator_; }
+    /// Columns for a spreadsheet: no header, a tab between them.
+    void SetExcelFormat();
+    /// Whether data tables print their name.
+    void WriteTableName(bool on) { writeTableName_ = on; }
+    /// Whether values of zero print as blanks.
+    void SetZeroBlank(bool on) { zeroBlank_ = on; }
+    bool IsZeroBlank() const { return zeroBlank_; }
+    bool GetPageBreaks() const { return pageBreaks_; } ///< the loaded template's option
+
+    // --- Identity, title, windows -----------------------------------------------------------------------------------
+
+    QString &GetTitle() { return title_; }
+    const QString &GetTitle() const { return title_; }
+    /// Sets the title and the header line. While an open pane has the title as its caption, the document's title gets a
+    /// number from 2 behind it; the header line keeps the title as given.
+    void SetTitle(const QString &title) override;
+    /// Sets the text of the report's own pane.
+    void SetWindowTextW(const QString &text);
+    /// The pane of the first view that shows the report's text, or null.
+    CViewPane *GetFrameWindow() const;
+    /// Opens a new pane for the report and updates all views. @param reserved  not looked at
+    void Activate(bool reserved);
+    /// Always "": a report is known by its object, not by an id.
+    QString GetDocId() const { return QString(); }
+    /// Always false.
+    bool IsThatDocId(const QString &) const { return false; }
+
+    void SetReportFileName(const QString &name) { reportFileName_ = name; }
+    const QString &GetReportFileName() const { return reportFileName_; }
+    /// Links a report window, which the document destroys with itself; null takes the link away.
+    void SetReportWindow(kareport::ReportWindow *window) { reportWindow_ = window; }
+    kareport::ReportWindow *GetReportWindow() const { return reportWindow_; }
+    void SetTextObject(void *object, unsigned size);
+    bool HasTextObj() const { return textObjectSize_ != 0; }
+    void *GetTextObject() const { return textObject_; }
+
+    void SetExternalEditorFlag(bool on) { externalEditor_ = on; }
+    bool GetExternalEditorFlag() const { return externalEditor_; }
+    void SetOptionExcel() { exportOptions_ |= optionExcel; }
+    bool IsOptionExcel() const { return (exportOptions_ & optionExcel) != 0; }
+    void SetExternalExcel() { exportOptions_ |= externalExcel; }
+    bool IsExternalExcel() const { return (exportOptions_ & externalExcel) != 0; }
+
+    // --- Life -------------------------------------------------------------------------------------------------------
+
+    bool OnNewDocument() override;
+    bool OnSaveDocument(const QString &path) override;
+    bool CanCloseFrame(CViewPane *pane) override;
+    void OnCloseDocument() override;
+    /// Closes the report at once or, when closing has been deferred, asks for it: the next call closes.
+    void CloseReportDocument();
+    /// 0 closes normally, 1 defers closing, 2 closing has been asked for.
+    void SetCloseDocument(int mode) { closeMode_ = mode; }
+    void SetCloseDocumentFlag(bool on) { closeDocument_ = on; }
+    bool GetCloseDocumentFlag() const { return closeDocument_; }
+    /// 0 forbids closing the report's panes.
+    void SetCanClose(int can) { canClose_ = can; }
+    void EnableCloseOption(bool on) { closeOptionEnabled_ = on; }
+    bool EnableCloseOption() const { return closeOptionEnabled_; }
+
+private:
+    enum ExportOption : unsigned
+    {
+        optionExcel = 1,
+        externalExcel = 2
+    };
+
+    void textWritten(QStringView text, int style) override;
+    void lineEnded() override;
+    void changed() override;
+
+    kareport::FormatOptions formatOptions() const;
+
+    /// Every live report, with the value true.
+    static QHash<const UReportDoc *, bool> UReportMgr;
+    /// Whether a value wider than its column prints as "#": one setting for all reports.
+    static bool printHash_;
+
+    std::unique_ptr<UXmlReportTpl> template_;
+    std::unique_ptr<UXmlReportTable> table_;
+    std::unique_ptr<UXmlReportBlock> block_;
+    UJobSettings settings_;
+    char16_t separator_ = u' ';
+    bool pageBreaks_ = true;
+    bool writeTableName_ = false;
+    bool zeroBlank_ = false;
+    UDocument *owner_;
+    kareport::PageWriter page_;
+    kareport::PageGeometry geometry_;
+    std::optional<int> fixedLinesPerPage_;
+    std::optional<int> fixedCharsPerRow_;
+    QMargins margins_ = {1000, 1000, 1200, 2000};
+    QString title_;
+    QString fontName_ = QStringLiteral("Lucida Console");
+    unsigned fontSize_ = 8;
+    bool externalEditor_;
+    int canClose_ = 1;
+    QString reportFileName_;
+    kareport::ReportWindow *reportWindow_ = nullptr;
+    int closeMode_ = 0;
+    bool closeDocument_;
+    bool openedFromRtf_ = false;
+    void *textObject_ = nullptr;
+    unsigned textObjectSize_ = 0;
+    bool closeOptionEnabled_ = true;
+    unsigned exportOptions_ = 0;
+    QString chainageLabel_;
+};

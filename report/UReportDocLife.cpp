@@ -1,0 +1,133 @@
+#include "UReportDoc.h"
+
+#include "CViewPane.h"
+#include "ReportViewPort.h"
+#include "ReportWindow.h"
+#include "TemplateText.h"
+#include "UDocTemplate.h"
+#include "UView.h"
+
+#include "ReportEntry.h"
+
+namespace
+{
+
+/// The window style of a pane that a report opens for itself.
+constexpr unsigned ownPaneStyle = 4096;
+
+bool showsReport(const UView *view)
+{
+    return dynamic_cast<const kareport::ReportViewPort *>(view) != nullptr;
+}
+
+bool isTaken(const QString &title, const QStringList &captions)
+{
+    for (const QString &caption : captions) {
+        if (kareport::equalFolded(title, caption)) {
+            return true;
+        }
+    }
+    return false;
+}
+
+} // namespace
+
+void UReportDoc::SetTitle(const QString &title)
+{
+    title_ = title;
+    SetHeader();
+    QStringList captions;
+    CViewPane::GetPaneCaptions(captions);
+    for (int number = 2; isTaken(title_, captions); ++number) {
+        title_ = title + u' ' + QString::number(number);
+    }
+    UDocument::SetTitle(title_);
+}
+
+void UReportDoc::SetWindowTextW(const QString &text)
+{
+    if (GetViews().empty() || !showsReport(GetViews().front())) {
+        return;
+    }
+    if (CViewPane *pane = GetViews().front()->GetParentPane()) {
+        pane->SetWindowTextW(text);
+    }
+}
+
+CViewPane *UReportDoc::GetFrameWindow() const
+{
+    for (const UView *view : GetViews()) {
+        if (showsReport(view)) {
+            return view->GetParentPane();
+        }
+    }
+    return nullptr;
+}
+
+void UReportDoc::Activate(bool /*reserved*/)
+{
+    if (UDocTemplate *reportTemplate = GetReportTemplate()) {
+        if (CViewPane *pane = reportTemplate->CreateNewPane(this, nullptr, ownPaneStyle, nullptr)) {
+            reportTemplate->InitialUpdatePane(pane, this, 1);
+        }
+    }
+    UpdateAllViews(nullptr, 0, nullptr);
+}
+
+bool UReportDoc::OnNewDocument()
+{
+    if (!UDocument::OnNewDocument()) {
+        return false;
+    }
+    SetPageSize();
+    return true;
+}
+
+bool UReportDoc::CanCloseFrame(CViewPane * /*pane*/)
+{
+    if (canClose_ == 0) {
+        return false;
+    }
+    // A numbered pane is one of several: another one keeps the document.
+    for (const UView *view : GetViews()) {
+        if (view->GetParentPane() != nullptr && view->GetParentPane()->GetWindowNumber() > 0) {
+            return true;
+        }
+    }
+    return SaveModified();
+}
+
+void UReportDoc::CloseReportDocument()
+{
+    const bool deferred = closeMode_ == 1;
+    closeMode_ = 2;
+    if (!deferred) {
+        OnCloseDocument();
+    }
+}
+
+void UReportDoc::OnCloseDocument()
+{
+    CViewPane *windowPane = nullptr;
+    if (reportWindow_ != nullptr) {
+        if (closeMode_ == 0) {
+            windowPane = reportWindow_->GetOwningPane();
+        } else if (closeMode_ != 2) {
+            return;
+        }
+    }
+    if (!IsSearchAndOrganizeHandler() || IsAutoDelete()) {
+        CloseAllPanes();
+        OnDocumentEvent(DocumentEvent::AfterCloseDocument);
+        DeleteContents();
+        if (IsAutoDelete()) {
+            if (owner_ != nullptr) {
+                owner_->OnReportClosed(this);
+            }
+            delete this;
+        }
+    }
+    if (windowPane != nullptr) {
+        windowPane->ClosePane();
+    }
+}

@@ -1,0 +1,131 @@
+#include "UReportDoc.h"
+
+#include "DataWriter.h"
+#include "FieldFormatter.h"
+#include "Folders.h"
+
+#include <QDir>
+
+#include <new>
+
+namespace
+{
+
+QString fileIn(QString folder, const QString &fileName)
+{
+    if (!folder.endsWith(u'/') && !folder.endsWith(QDir::separator())) {
+        folder += QDir::separator();
+    }
+    return folder + fileName;
+}
+
+} // namespace
+
+bool UReportDoc::LoadTemplateXml(const QString &fileName, const QString &templateName, const QString &tableName,
+                                 const QString &blockName)
+{
+    // The handles point into the template that goes: they go with it.
+    table_.reset();
+    block_.reset();
+    template_ = std::make_unique<UXmlReportTpl>();
+    if (!template_->LoadTemplate(fileIn(GetLibraryDir(false), fileName), templateName) &&
+        !template_->LoadTemplate(fileIn(GetStartPathName(), fileName), templateName)) {
+        return false;
+    }
+    pageBreaks_ = template_->GetPageBreakXmlOption();
+    // The option is a signed 8-bit character and is widened with its sign.
+    separator_ = static_cast<char16_t>(static_cast<qint16>(static_cast<signed char>(template_->GetSeparatorXmlOption())));
+    if (!tableName.isEmpty() && !LoadTemplateTable(tableName)) {
+        return false;
+    }
+    if (!blockName.isEmpty() && !LoadTemplateBlock(blockName)) {
+        return false;
+    }
+    SetTitle(template_->GetTemplateTitle());
+    return true;
+}
+
+bool UReportDoc::LoadTemplateTable(const QString &tableName)
+{
+    if (!template_) {
+        return false;
+    }
+    table_ = std::make_unique<UXmlReportTable>();
+    table_->SetColumnSeparator(static_cast<char>(separator_ & 0xFF));
+    if (!table_->LoadTable(tableName, template_.get())) {
+        return false;
+    }
+    if (template_->SetNorthEastTableFieldOrder(tableName, static_cast<ORIENTATION_ORDER>(settings_.northEastOrder))) {
+        table_->ReorderingHeading();
+    }
+    return true;
+}
+
+bool UReportDoc::LoadTemplateBlock(const QString &blockName)
+{
+    if (!template_) {
+        return false;
+    }
+    block_ = std::make_unique<UXmlReportBlock>();
+    return block_->LoadBlock(blockName, template_.get());
+}
+
+kareport::FormatOptions UReportDoc::formatOptions() const
+{
+    return {&settings_, separator_, zeroBlank_, printHash_};
+}
+
+QString UReportDoc::FormatXmlStringToDisplay(const sXmlReportField *field, int kind, const void *value,
+                                             const QString &offsetStyle) const
+{
+    kareport::TextBuffer text;
+    kareport::FieldFormatter(*field).append(text, formatOptions(), kind, value, offsetStyle);
+    return text.view().toString();
+}
+
+bool UReportDoc::WriteDataBlock(const UDataObject *object, int linesBefore, int linesAfter)
+try {
+    if (!template_ || !block_ || object == nullptr) {
+        return false;
+    }
+    const kareport::FormatOptions options = formatOptions();
+    kareport::DataWriter(page_, options).writeBlock(*block_, *object, linesBefore, linesAfter);
+    return true;
+} catch (const std::bad_alloc &) {
+    return false;
+}
+
+bool UReportDoc::WriteDataBlock(const QString &blockName, const UDataObject *object, int linesBefore, int linesAfter)
+{
+    return LoadTemplateBlock(blockName) && WriteDataBlock(object, linesBefore, linesAfter);
+}
+
+bool UReportDoc::WriteDataTable(UDataObjectList *list, int linesBefore, int linesAfter, int headingLinesAfter)
+try {
+    if (!template_ || !table_ || list == nullptr) {
+        return false;
+    }
+    const kareport::FormatOptions options = formatOptions();
+    kareport::DataWriter(page_, options)
+        .writeTable(*table_, *list, {linesBefore, linesAfter, headingLinesAfter, chainageLabel_, writeTableName_});
+    return true;
+} catch (const std::bad_alloc &) {
+    return false;
+}
+
+bool UReportDoc::WriteDataTable(const QString &tableName, UDataObjectList *list, int linesBefore, int linesAfter,
+                                int headingLinesAfter)
+{
+    return LoadTemplateTable(tableName) && WriteDataTable(list, linesBefore, linesAfter, headingLinesAfter);
+}
+
+void UReportDoc::SetDataColumnSeparator(char16_t separator, bool raw)
+{
+    separator_ = raw ? u'\xFF' : separator;
+}
+
+void UReportDoc::SetExcelFormat()
+{
+    SetHeaderFlag(false);
+    separator_ = u'\t';
+}

@@ -1,0 +1,71 @@
+#!/usr/bin/env bash
+# Installs the Debian packages that a task needs and that are not there yet.
+#
+#   scripts/packages.sh build|test|bench|fuzz [...]
+#
+# Every package stands here once, with the reason for it. Nothing is asked of apt when all are installed.
+set -euo pipefail
+
+packages_build=(
+    g++ cmake ninja-build   # compiler and build
+    ccache                  # a second build in seconds
+    qt6-base-dev            # text, files, JSON, settings, fonts, printing
+    libcli11-dev            # the command line
+    fonts-dejavu-core       # the fixed-pitch face that a page is measured with
+)
+packages_test=(
+    libgtest-dev            # tests
+    libgmock-dev            # matchers
+    clang-format            # the format check
+    clang                   # second opinion on warnings, fuzz targets
+    libclang-rt-14-dev      # run-time library of the fuzz targets
+    python3                 # the check scripts
+)
+packages_bench=(
+    libbenchmark-dev        # micro benchmarks
+    mawk                    # compared against
+    time                    # peak memory of a process
+    python3                 # the whole-process runs
+)
+packages_tidy=(
+    clang-tidy
+)
+packages_coverage=(
+    gcovr
+)
+
+wanted=()
+for group in "$@"; do
+    declare -n list="packages_$group"
+    wanted+=("${list[@]}")
+done
+
+missing=()
+for package in $(printf '%s\n' "${wanted[@]}" | sort -u); do
+    status=$(dpkg-query -W -f '${db:Status-Status}' "$package" 2>/dev/null || true)
+    [ "$status" = installed ] || missing+=("$package")
+done
+[ ${#missing[@]} -eq 0 ] && exit 0
+
+echo "Installing from Debian's packages: ${missing[*]}"
+as_root=()
+if [ "$(id -u)" -ne 0 ]; then
+    if ! command -v sudo > /dev/null; then
+        echo "These packages are missing and can only be installed as root: ${missing[*]}" >&2
+        exit 1
+    fi
+    as_root=(sudo)
+fi
+export DEBIAN_FRONTEND=noninteractive
+install=("${as_root[@]}" apt-get install -y -q --no-install-recommends)
+log=$(mktemp)
+trap 'rm -f "$log"' EXIT
+# The package lists may be absent or too old on a fresh machine: fetch them and try again.
+if ! "${install[@]}" "${missing[@]}" > "$log" 2>&1; then
+    "${as_root[@]}" apt-get update -q > /dev/null
+    if ! "${install[@]}" "${missing[@]}" > "$log" 2>&1; then
+        cat "$log" >&2
+        echo "The packages could not be installed." >&2
+        exit 1
+    fi
+fi

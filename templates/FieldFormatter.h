@@ -1,0 +1,64 @@
+#pragma once
+
+#include "KaReportExport.h"
+#include "TemplateText.h"
+#include "TextBuffer.h"
+#include "UJobSettings.h"
+#include "sXmlReportField.h"
+
+#include <QStringView>
+
+namespace kareport
+{
+
+/// What the formatting of a value depends on beside its field.
+struct FormatOptions
+{
+    const UJobSettings *settings = nullptr;
+    char16_t separator = u' '; ///< a tab trims every value and fills no column
+    bool zeroBlank = false;    ///< a value of exactly 0 shows as blanks
+    bool printHash = false;    ///< a text wider than its column shows as "#"
+};
+
+/// A field prepared for being formatted row after row.
+class KAREPORT_EXPORT FieldFormatter
+{
+public:
+    explicit FieldFormatter(const sXmlReportField &field);
+
+    FieldMarker marker() const { return marker_; }
+    quint32 id() const { return id_; }
+
+    /// Appends a value's text, fitted to the field's column.
+    /// @param kind    what `value` points to: 1 a bool, 2 a qint16, 4 a qint32, 8 a double in internal units, 16 a
+    ///                QString, 32 a UPointNumber; any other kind counts as 0, false or an empty text
+    /// @param suffix  "+" shows an offset with its sign, anything else with "L" or "R" behind it
+    void append(TextBuffer &out, const FormatOptions &options, int kind, const void *value, QStringView suffix) const;
+
+private:
+    enum class Align
+    {
+        Left,
+        Centre,
+        Right
+    };
+    struct Input;
+
+    void appendValue(TextBuffer &out, const FormatOptions &options, const Input &input, QStringView suffix) const;
+    void appendNumber(TextBuffer &out, double value, int decimals) const;
+    void appendLength(TextBuffer &out, const UJobSettings &settings, double value) const;
+    void appendBearing(TextBuffer &out, const UJobSettings &settings, double value) const;
+    void appendOffset(TextBuffer &out, const UJobSettings &settings, double value, bool withSign) const;
+    void appendThickness(TextBuffer &out, double value) const;
+    void fit(TextBuffer &out, std::size_t start, char16_t separator) const;
+    void centre(TextBuffer &out, std::size_t start) const;
+
+    FieldMarker marker_;
+    Align align_;
+    qint32 width_;
+    qint32 decimals_;
+    qint32 type_;
+    quint32 id_;
+};
+
+} // namespace kareport

@@ -1,0 +1,8 @@
+#pragma once
+
+/// Order of the northing and easting columns.
+enum ORIENTATION_ORDER
+{
+    ORDER_EASTING_NORTHING = 0,
+    ORDER_NORTHING_EASTING = 1
+};

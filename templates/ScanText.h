@@ -1,0 +1,51 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QString>
+#include <QStringView>
+
+#include <vector>
+
+namespace kareport
+{
+
+/// A piece of template text that remembers where each of its characters stood in the file, through every cut, so that
+/// a remark about it can name line and column.
+class KAREPORT_EXPORT ScanText
+{
+public:
+    ScanText() = default;
+    /// A text of its own, whose characters stand where they are.
+    explicit ScanText(QString text);
+
+    QStringView view() const { return text_; }
+    const QString &text() const { return text_; }
+    bool isEmpty() const { return text_.isEmpty(); }
+    qsizetype size() const { return text_.size(); }
+
+    /// Appends characters that stand one behind the other from `source` on.
+    void append(QStringView characters, qsizetype source);
+    /// The `count` characters from `from` on.
+    ScanText sliced(qsizetype from, qsizetype count) const;
+    /// Takes `count` characters from `from` on out of the text; what is left closes up.
+    void remove(qsizetype from, qsizetype count);
+
+    /// Where the character at a position (0 to `size()`) stood; the end stands behind the last character.
+    qsizetype sourceOf(qsizetype position) const;
+
+private:
+    /// From `at` on, up to the next run, the characters stood one behind the other from `source` on.
+    struct Run
+    {
+        qsizetype at;
+        qsizetype source;
+    };
+
+    std::size_t runAt(qsizetype position) const;
+
+    QString text_;
+    std::vector<Run> runs_;
+};
+
+} // namespace kareport

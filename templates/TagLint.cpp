@@ -1,0 +1,93 @@
+#include "TagLint.h"
+
+#include "TemplateText.h"
+
+#include <algorithm>
+#include <array>
+
+namespace kareport
+{
+
+namespace
+{
+
+constexpr std::array<QStringView, 25> elementNames = {
+    u"ReportTemplate", u"Name",         u"Title",    u"Tables",       u"Table",     u"Use",
+    u"Sort",           u"OutputList",   u"Field",    u"VariableName", u"Label",     u"Format",
+    u"Align",          u"Dictionaries", u"Variable", u"Dictionary",   u"ID",        u"DictionaryName",
+    u"VariableList",   u"Type",         u"Blocks",   u"Block",        u"Separator", u"PageBreaks",
+    u"Options"};
+
+/// Longer than any tag that somebody means as one, attributes included.
+constexpr qsizetype longestTag = 200;
+constexpr qsizetype longestQuote = 40;
+
+bool isElementName(QStringView name)
+{
+    return std::any_of(elementNames.begin(), elementNames.end(),
+                       [name](QStringView known) { return equalFolded(known, name); });
+}
+
+/// What stands between "<" and ">" of the tag at a position; empty when there is no such text.
+QStringView tagText(QStringView text, qsizetype at)
+{
+    const QStringView rest = text.sliced(at + 1).first(std::min(longestTag, text.size() - at - 1));
+    const auto *const end =
+        std::find_if(rest.begin(), rest.end(), [](QChar character) { return character == u'>' || character == u'<'; });
+    return end != rest.end() && *end == u'>' ? QStringView(rest.begin(), end) : QStringView();
+}
+
+/// The name in a tag's text, without what surrounds it.
+QStringView nameIn(QStringView tag)
+{
+    qsizetype begin = 0;
+    while (begin < tag.size() && (tag[begin] == u'/' || tag[begin].isSpace())) {
+        ++begin;
+    }
+    qsizetype end = begin;
+    while (end < tag.size() && tag[end].unicode() < 128 && tag[end].isLetter()) {
+        ++end;
+    }
+    return tag.sliced(begin, end - begin);
+}
+
+} // namespace
+
+QString elementName(QStringView tag)
+{
+    const auto *const found = std::find_if(elementNames.begin(), elementNames.end(),
+                                           [tag](QStringView known) { return equalFolded(known, tag); });
+    if (found != elementNames.end()) {
+        return found->toString();
+    }
+    return tag.toString();
+}
+
+std::vector<TagRemark> findIgnoredTags(const ScanText &file)
+{
+    std::vector<TagRemark> remarks;
+    const QStringView text = file.view();
+    qsizetype commentEnd = 0;
+    for (qsizetype at = text.indexOf(u'<'); at >= 0; at = text.indexOf(u'<', at + 1)) {
+        if (at >= commentEnd && text.sliced(at).startsWith(u"<!--")) {
+            const qsizetype end = text.indexOf(u"-->", at);
+            commentEnd = end < 0 ? text.size() : end;
+            continue;
+        }
+        const QStringView tag = tagText(text, at);
+        const QStringView name = nameIn(tag);
+        if (name.isEmpty() || !isElementName(name)) {
+            continue;
+        }
+        const bool isTag = tag == name || (tag.startsWith(u'/') && tag.sliced(1) == name);
+        const bool inComment = at < commentEnd;
+        if (isTag == inComment) {
+            QString quote = u'<' + tag.first(std::min(tag.size(), longestQuote)).toString();
+            quote += tag.size() > longestQuote ? QStringLiteral("…>") : QStringLiteral(">");
+            remarks.push_back({isTag ? TagRemark::Kind::InComment : TagRemark::Kind::NotATag, file.sourceOf(at), quote});
+        }
+    }
+    return remarks;
+}
+
+} // namespace kareport

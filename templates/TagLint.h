@@ -1,0 +1,30 @@
+#pragma once
+
+#include "ScanText.h"
+
+#include <QString>
+
+#include <vector>
+
+namespace kareport
+{
+
+/// The usual spelling of an element's name, "ReportTemplate" for REPORTTEMPLATE; another name comes back as it is.
+QString elementName(QStringView tag);
+
+/// A piece of text that looks like a tag of a template and is none, or the other way round.
+struct TagRemark
+{
+    enum class Kind
+    {
+        NotATag,  ///< blanks, attributes or a slash: the scanner does not see it
+        InComment ///< a tag inside a comment: the scanner does not see the comment
+    };
+    Kind kind;
+    qsizetype source; ///< where in the file
+    QString text;     ///< as it stands, cut short
+};
+
+std::vector<TagRemark> findIgnoredTags(const ScanText &file);
+
+} // namespace kareport

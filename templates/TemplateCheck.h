@@ -1,0 +1,29 @@
+#pragma once
+
+#include "KaReportExport.h"
+#include "TemplateFile.h"
+#include "TextPlaces.h"
+
+#include <QString>
+
+#include <vector>
+
+namespace kareport
+{
+
+/// Something in a template file that is read in another way than it looks, or not at all.
+struct TemplateRemark
+{
+    TextPlace place;
+    bool isError = false; ///< the report would come out wrong; otherwise it may be meant
+    QString text;         ///< one sentence, translated
+};
+
+/// A width or a number of decimals above this is taken for a mistake.
+inline constexpr qint32 widestColumn = 32767;
+
+/// Reads every template of a file as the module reads it and says what the module passes over in silence, in the order
+/// of the file.
+KAREPORT_EXPORT std::vector<TemplateRemark> checkTemplates(const TemplateFile &file);
+
+} // namespace kareport

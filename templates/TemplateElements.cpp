@@ -1,0 +1,141 @@
+#include "TemplateElements.h"
+
+namespace kareport
+{
+
+namespace
+{
+
+/// Where the parts of a table or a block are cut out of, one after the other: each cut changes what the next one sees,
+/// so the order of the cuts belongs to the format.
+using FieldReader = FieldElement (*)(ScanElement element, ScanNotes *notes);
+
+FieldElement readTableField(ScanElement element, ScanNotes *notes)
+{
+    ScanText rest = element.value;
+    FieldElement field;
+    field.element = std::move(element);
+    field.format = ExtractNode(rest, u"FORMAT", true, notes);
+    field.label = ExtractNode(rest, u"LABEL", true, notes);
+    field.align = ExtractNode(rest, u"ALIGN", true, notes);
+    field.variableName = ExtractNode(rest, u"VARIABLENAME", true, notes);
+    return field;
+}
+
+FieldElement readBlockField(ScanElement element, ScanNotes *notes)
+{
+    ScanText rest = element.value;
+    FieldElement field;
+    field.element = std::move(element);
+    field.variableName = ExtractNode(rest, u"VARIABLENAME", true, notes);
+    field.label = ExtractNode(rest, u"LABEL", true, notes);
+    field.format = ExtractNode(rest, u"FORMAT", true, notes);
+    field.align = ExtractNode(rest, u"ALIGN", true, notes);
+    return field;
+}
+
+std::vector<OutputElement> readOutputs(const ScanText &list, QStringView tag, FieldReader readField, ScanNotes *notes)
+{
+    std::vector<OutputElement> outputs;
+    NodeSequence sequence(list, tag, notes);
+    while (auto element = sequence.next()) {
+        ScanText rest = element->value;
+        OutputElement output;
+        output.element = std::move(*element);
+        output.name = ExtractNode(rest, u"NAME", true, notes);
+        output.use = ExtractNode(rest, u"USE", true, notes);
+        const ScanElement outputList = ExtractNode(rest, u"OUTPUTLIST", true, notes);
+        NodeSequence fields(outputList.value, u"FIELD", notes);
+        while (auto field = fields.next()) {
+            output.fields.push_back(readField(std::move(*field), notes));
+        }
+        outputs.push_back(std::move(output));
+    }
+    return outputs;
+}
+
+} // namespace
+
+std::vector<TemplateElement> readTemplateElements(const ScanText &file, ScanNotes *notes)
+{
+    std::vector<TemplateElement> templates;
+    NodeSequence sequence(file, u"REPORTTEMPLATE", notes);
+    while (auto element = sequence.next()) {
+        ScanText rest = element->value;
+        TemplateElement found;
+        found.body = std::move(*element);
+        found.name = ExtractNode(rest, u"NAME", true, notes);
+        found.title = ExtractNode(rest, u"TITLE", true, notes);
+        templates.push_back(std::move(found));
+    }
+    return templates;
+}
+
+std::vector<OutputElement> readTableElements(const ScanText &body, ScanNotes *notes)
+{
+    return readOutputs(GetNode(body, u"TABLES", notes).value, u"TABLE", readTableField, notes);
+}
+
+std::vector<OutputElement> readBlockElements(const ScanText &body, ScanNotes *notes)
+{
+    return readOutputs(GetNode(body, u"BLOCKS", notes).value, u"BLOCK", readBlockField, notes);
+}
+
+std::vector<SortElement> readSortElements(const ScanText &body, ScanNotes *notes)
+{
+    std::vector<SortElement> sorts;
+    const ScanElement tables = GetNode(body, u"TABLES");
+    NodeSequence sequence(tables.value, u"TABLE");
+    while (auto element = sequence.next()) {
+        ScanText rest = std::move(element->value);
+        SortElement sort;
+        sort.name = ExtractNode(rest, u"NAME", true);
+        sort.use = ExtractNode(rest, u"USE", true);
+        const ScanElement list = ExtractNode(rest, u"SORT", true, notes);
+        NodeSequence names(list.value, u"VARIABLENAME", notes);
+        while (auto name = names.next()) {
+            sort.variableNames.push_back(std::move(*name));
+        }
+        if (!sort.variableNames.empty()) {
+            sorts.push_back(std::move(sort));
+        }
+    }
+    return sorts;
+}
+
+std::vector<DictionaryElement> readDictionaryElements(const ScanText &body, ScanNotes *notes)
+{
+    std::vector<DictionaryElement> dictionaries;
+    const ScanElement list = GetNode(body, u"DICTIONARIES", notes);
+    NodeSequence sequence(list.value, u"DICTIONARY", notes);
+    while (auto element = sequence.next()) {
+        ScanText rest = element->value;
+        DictionaryElement dictionary;
+        dictionary.element = std::move(*element);
+        dictionary.name = ExtractNode(rest, u"DICTIONARYNAME", true, notes);
+        const ScanElement variables = ExtractNode(rest, u"VARIABLELIST", true, notes);
+        NodeSequence variableSequence(variables.value, u"VARIABLE", notes);
+        while (auto variable = variableSequence.next()) {
+            ScanText parts = variable->value;
+            VariableElement read;
+            read.element = std::move(*variable);
+            read.id = ExtractNode(parts, u"ID", true, notes);
+            read.variableName = ExtractNode(parts, u"VARIABLENAME", true, notes);
+            read.type = ExtractNode(parts, u"TYPE", true, notes);
+            dictionary.variables.push_back(std::move(read));
+        }
+        dictionaries.push_back(std::move(dictionary));
+    }
+    return dictionaries;
+}
+
+OptionElements readOptionElements(const ScanText &body, ScanNotes *notes)
+{
+    OptionElements elements;
+    elements.options = GetNode(body, u"OPTIONS", notes);
+    elements.separator = GetNode(elements.options.value, u"SEPARATOR", notes);
+    elements.pageBreaks = GetNode(elements.options.value, u"PAGEBREAKS", notes);
+    return elements;
+}
+
+} // namespace kareport

@@ -1,0 +1,75 @@
+#pragma once
+
+#include "TagScanner.h"
+
+#include <vector>
+
+namespace kareport
+{
+
+/// The elements of a template as the scanner finds them, before anything is made of their values.
+
+struct FieldElement
+{
+    ScanElement element;
+    ScanElement variableName;
+    ScanElement label;
+    ScanElement format;
+    ScanElement align;
+};
+
+struct OutputElement ///< a table or a block
+{
+    ScanElement element;
+    ScanElement name;
+    ScanElement use;
+    std::vector<FieldElement> fields;
+};
+
+struct SortElement
+{
+    ScanElement name;
+    ScanElement use;
+    std::vector<ScanElement> variableNames;
+};
+
+struct VariableElement
+{
+    ScanElement element;
+    ScanElement id;
+    ScanElement variableName;
+    ScanElement type;
+};
+
+struct DictionaryElement
+{
+    ScanElement element;
+    ScanElement name;
+    std::vector<VariableElement> variables;
+};
+
+struct OptionElements
+{
+    ScanElement options;
+    ScanElement separator;
+    ScanElement pageBreaks;
+};
+
+struct TemplateElement
+{
+    ScanElement body; ///< with its name and title
+    ScanElement name;
+    ScanElement title;
+};
+
+/// The templates of a whole file, in file order.
+std::vector<TemplateElement> readTemplateElements(const ScanText &file, ScanNotes *notes = nullptr);
+
+// The parts of one template's body.
+std::vector<OutputElement> readTableElements(const ScanText &body, ScanNotes *notes = nullptr);
+std::vector<OutputElement> readBlockElements(const ScanText &body, ScanNotes *notes = nullptr);
+std::vector<SortElement> readSortElements(const ScanText &body, ScanNotes *notes = nullptr);
+std::vector<DictionaryElement> readDictionaryElements(const ScanText &body, ScanNotes *notes = nullptr);
+OptionElements readOptionElements(const ScanText &body, ScanNotes *notes = nullptr);
+
+} // namespace kareport

@@ -1,0 +1,32 @@
+#pragma once
+
+#include "KaReportExport.h"
+#include "ScanText.h"
+
+#include <QByteArrayView>
+#include <QString>
+
+#include <optional>
+
+namespace kareport
+{
+
+/// The text of a template file: UTF-8 when the whole file is valid UTF-8, else Latin-1. The file counts as read in
+/// chunks of 4095 bytes, and a zero byte ends its chunk's text.
+class KAREPORT_EXPORT TemplateFile
+{
+public:
+    explicit TemplateFile(QByteArrayView bytes);
+
+    /// Reads a file; nothing when it cannot be opened or read.
+    static std::optional<TemplateFile> read(const QString &path);
+
+    /// The text as it stands.
+    const QString &text() const { return text_; }
+    /// The text that is scanned: without tabs, line feeds and carriage returns, which also values lose.
+    ScanText scanText() const;
+private:
+    QString text_;
+};
+
+} // namespace kareport

@@ -1,0 +1,99 @@
+#pragma once
+
+#include "KaReportExport.h"
+#include "OrientationOrder.h"
+#include "ScanText.h"
+#include "sXmlReportBlock.h"
+#include "sXmlReportDictionary.h"
+#include "sXmlReportOption.h"
+#include "sXmlReportTable.h"
+#include "sXmlReportTemplateInfo.h"
+#include "sXmlSortTableReport.h"
+
+#include <QHash>
+#include <QString>
+#include <QStringList>
+
+#include <vector>
+
+/// One report template, read from a file that may hold several. Names are compared without regard to case.
+///
+/// The records that the functions hand out belong to this object; a pointer to one is valid until the next load or the
+/// object's end.
+class KAREPORT_EXPORT UXmlReportTpl
+{
+public:
+    UXmlReportTpl();
+    ~UXmlReportTpl();
+    UXmlReportTpl(const UXmlReportTpl &) = delete;
+    UXmlReportTpl &operator=(const UXmlReportTpl &) = delete;
+
+    /// Reads a template file and chooses the template of a name; of several with that name, the last.
+    /// @return false when the file cannot be read, the name is empty or the file has no such template. The object then
+    ///         holds nothing, the list of templates included.
+    bool LoadTemplate(const QString &fileName, const QString &templateName);
+
+    /// The title of the chosen template: of several with its name, the first one's; "" when nothing is loaded.
+    QString GetTemplateTitle() const;
+
+    // Each replaces the content of the list that it fills.
+    void GetAllTPLsByName(QStringList &names) const;   ///< all templates of the file, in file order
+    void GetAllTPLsByTitle(QStringList &titles) const; ///< all templates of the file, in file order
+    void GetAllTables(QStringList &names) const;
+    void GetAllBlocks(QStringList &names) const;
+    void GetAllDictionaries(QStringList &names) const;
+
+    const sXmlReportOption *GetOption() const { return &option_; }
+    char GetSeparatorXmlOption() const { return option_.Separator; }
+    bool GetPageBreakXmlOption() const { return option_.PageBreaks; }
+
+    // The first record of a name; null for an empty name or when there is none.
+    const sXmlReportTable *GetTable(const QString &name) const;
+    const sXmlReportBlock *GetBlock(const QString &name) const;
+    const sXmlReportDictionary *GetDictionary(const QString &name) const;
+    const sXmlSortTableReport *GetSortList(const QString &tableName) const;
+
+    /// Puts the fields "Northing" and "Easting" of a table into an order, each with its label, width and all. A table
+    /// that lacks one of the two stays as it is.
+    /// @return false when there is no such table
+    bool SetNorthEastTableFieldOrder(const QString &tableName, ORIENTATION_ORDER order);
+
+private:
+    bool SetXml(const QString &xml);
+    QString GetXml() const { return xml_.text(); }
+
+    bool ReadXmlData();
+    bool ReadTemplatesAvailable();
+    bool ReadTables();
+    bool ReadDictionary();
+    bool ReadBlocks();
+    bool ReadOptions();
+    void ReadSortData();
+    void MergeTableWithDictionary();
+    void MergeBlockWithDictionary();
+    void MergeSortWithDictionary();
+    void GetDicInfo(const QString &dictionaryName, const QString &variableName, qint32 &id, qint32 &type) const;
+    void CleanData(bool keepText);
+
+    struct VariableInfo
+    {
+        qint32 id;
+        qint32 type;
+    };
+
+    kareport::ScanText xml_; ///< after loading, the body of the chosen template
+    QString name_;
+    QStringList tableNames_;
+    QStringList dictionaryNames_;
+    QStringList blockNames_;
+    std::vector<sXmlReportTable> tables_;
+    std::vector<sXmlReportDictionary> dictionaries_;
+    std::vector<sXmlReportBlock> blocks_;
+    std::vector<sXmlReportTemplateInfo> templates_;
+    std::vector<sXmlSortTableReport> sortLists_;
+    sXmlReportOption option_;
+    /// The variables by the folded names of their dictionary and their own; of several with one name, the last.
+    QHash<QString, QHash<QString, VariableInfo>> variables_;
+
+    friend class UXmlReportTplTest;
+};

@@ -1,0 +1,11 @@
+#pragma once
+
+#include "sXmlReportField.h"
+
+/// A table of a template: one row for each object under a heading.
+struct sXmlReportTable
+{
+    QString Name;
+    QString Use; ///< the name of its dictionary
+    sXmlReportFields Fields;
+};

@@ -1,0 +1,10 @@
+#pragma once
+
+#include <QString>
+
+/// A template of a template file.
+struct sXmlReportTemplateInfo
+{
+    QString Name;
+    QString Title;
+};
