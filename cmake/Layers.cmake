@@ -6,7 +6,7 @@ target_compile_definitions(ka_options INTERFACE
     QT_NO_KEYWORDS QT_NO_CAST_TO_ASCII QT_NO_FOREACH QT_NO_URL_CAST_FROM_STRING QT_STRICT_ITERATORS)
 target_compile_options(ka_options INTERFACE
     -Wall -Wextra -Wpedantic -Wshadow -Wconversion -Wsign-conversion -Wold-style-cast -Wnon-virtual-dtor
-    -Woverloaded-virtual -Wnull-dereference -Wundef -Wcast-align)
+    -Woverloaded-virtual -Wundef -Wcast-align)
 if(KAREPORT_WERROR)
     target_compile_options(ka_options INTERFACE -Werror)
 endif()

@@ -154,18 +154,20 @@ void UXmlReportTpl::ReadSortData()
     }
 }
 
-void UXmlReportTpl::GetDicInfo(const QString &dictionaryName, const QString &variableName, qint32 &id,
-                               qint32 &type) const
+bool UXmlReportTpl::FindVariable(const QString &dictionaryName, const QString &variableName, qint32 &id,
+                                 qint32 &type) const
 {
     const auto dictionary = variables_.constFind(foldedKey(dictionaryName));
     if (dictionary == variables_.constEnd()) {
-        return;
+        return false;
     }
     const auto variable = dictionary->constFind(foldedKey(variableName));
-    if (variable != dictionary->constEnd()) {
-        id = variable->id;
-        type = variable->type;
+    if (variable == dictionary->constEnd()) {
+        return false;
     }
+    id = variable->id;
+    type = variable->type;
+    return true;
 }
 
 void UXmlReportTpl::MergeTableWithDictionary()

@@ -53,6 +53,10 @@ public:
     const sXmlReportDictionary *GetDictionary(const QString &name) const;
     const sXmlSortTableReport *GetSortList(const QString &tableName) const;
 
+    /// Gives a dictionary variable's identifier and type, as the fields that name it get them: of several dictionaries
+    /// and variables of the names, the last. @return false, with nothing changed, when there is none
+    bool FindVariable(const QString &dictionaryName, const QString &variableName, qint32 &id, qint32 &type) const;
+
     /// Puts the fields "Northing" and "Easting" of a table into an order, each with its label, width and all. A table
     /// that lacks one of the two stays as it is.
     /// @return false when there is no such table
@@ -72,7 +76,10 @@ private:
     void MergeTableWithDictionary();
     void MergeBlockWithDictionary();
     void MergeSortWithDictionary();
-    void GetDicInfo(const QString &dictionaryName, const QString &variableName, qint32 &id, qint32 &type) const;
+    void GetDicInfo(const QString &dictionaryName, const QString &variableName, qint32 &id, qint32 &type) const
+    {
+        FindVariable(dictionaryName, variableName, id, type);
+    }
     void CleanData(bool keepText);
 
     struct VariableInfo

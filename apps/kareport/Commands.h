@@ -1,0 +1,64 @@
+#pragma once
+
+#include <QString>
+#include <QStringList>
+
+#include <optional>
+
+namespace kareport
+{
+
+/// What the program answers to its caller.
+enum ExitStatus
+{
+    exitDone = 0,
+    exitUsage = 1,        ///< the command line is wrong
+    exitInput = 2,        ///< the job, a template or data is wrong; nothing was written
+    exitOutput = 3,       ///< an output could not be written; an existing file keeps its content
+    exitInterrupted = 130 ///< stopped from the keyboard; nothing was written
+};
+
+/// `kareport render`
+struct RenderCommand
+{
+    QString job; ///< empty for the short form
+    QString templateFile;
+    QString templateName;
+    QString table;
+    QString block;
+    QString data;
+    QStringList outputs;
+    QString as;
+    QStringList sets;
+    bool progress = false;
+    bool quiet = false;
+
+    /// What is wrong with the options together; nothing when they make sense.
+    std::optional<QString> usageError() const;
+    /// `argc` and `argv` are the program's own, for Qt.
+    ExitStatus run(int &argc, char **argv) const;
+};
+
+/// `kareport templates`
+struct TemplatesCommand
+{
+    QString file;
+    QString name; ///< empty to list the file's templates
+    bool json = false;
+
+    ExitStatus run() const;
+};
+
+/// `kareport check`
+struct CheckCommand
+{
+    QString file;
+
+    ExitStatus run() const;
+};
+
+/// Writes a line to standard output or standard error.
+void printLine(const QString &line);
+void printError(const QString &line);
+
+} // namespace kareport

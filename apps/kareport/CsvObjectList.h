@@ -1,0 +1,64 @@
+#pragma once
+
+#include "CsvReader.h"
+#include "DataUnits.h"
+#include "UDataObjectList.h"
+#include "ValueParser.h"
+
+#include <functional>
+#include <optional>
+
+namespace kareport
+{
+
+/// Finds the variable of a column: its parser, or nothing when the dictionary does not know the name.
+using FindVariable = std::function<std::optional<ValueParser>(const QString &name)>;
+/// Is told now and then how many bytes have been read. @return false to stop
+using ReadProgress = std::function<bool(std::size_t bytes)>;
+
+/// The rows of a CSV file as data objects, made one at a time while they are asked for in turn: the file is read once
+/// and no object is kept. When something is wrong with a row, the list ends there and `error` says what.
+class CsvObjectList : public UDataObjectList
+{
+public:
+    /// Reads the header row. Columns that the dictionary does not know are passed over.
+    CsvObjectList(std::shared_ptr<const FileBytes> file, char delimiter, const FindVariable &findVariable,
+                  ReadProgress progress);
+
+    UDataObject *GetAt(std::size_t index) override;
+    /// Reads the sort keys of all rows and orders the places of the rows; they are then read in that order.
+    void Sort(const std::vector<unsigned> &ids) override;
+
+    const std::optional<InputError> &error() const { return error_; }
+
+private:
+    struct Column
+    {
+        QString name;
+        std::optional<ValueParser> parser;
+    };
+    struct RowPlace
+    {
+        std::size_t start;
+        qsizetype line;
+    };
+
+    void readHeader(const FindVariable &findVariable);
+    bool readRow();
+    bool storeCells(UDataObject &object, const std::vector<unsigned> *onlyIds);
+    bool goOn();
+    void rewind();
+
+    std::shared_ptr<const FileBytes> file_;
+    CsvReader reader_;
+    ReadProgress progress_;
+    std::vector<Column> columns_;
+    RowPlace firstRow_{};
+    std::optional<std::vector<RowPlace>> order_; ///< of a sorted list
+    UDataObject row_;
+    std::size_t nextIndex_ = 0; ///< of the row that is read next
+    bool stopped_ = false;
+    std::optional<InputError> error_;
+};
+
+} // namespace kareport

@@ -1,0 +1,247 @@
+#include "CsvReader.h"
+
+#include "Xlate.h"
+
+#include <QUtf8StringView>
+
+#include <algorithm>
+
+namespace kareport
+{
+
+namespace
+{
+
+enum ByteClass : unsigned char
+{
+    ordinary = 0,
+    high,     ///< part of a character outside ASCII
+    special   ///< ends a cell or stands nowhere in a plain one
+};
+
+constexpr std::string_view byteOrderMark = "\xEF\xBB\xBF";
+
+bool isUtf8(std::string_view text)
+{
+    return QUtf8StringView(text.data(), static_cast<qsizetype>(text.size())).isValidUtf8();
+}
+
+} // namespace
+
+Expected<std::shared_ptr<const FileBytes>> FileBytes::open(const QString &path)
+{
+    auto bytes = std::make_shared<FileBytes>();
+    bytes->path_ = path;
+    bytes->file_.setFileName(path);
+    if (!bytes->file_.open(QIODevice::ReadOnly)) {
+        return InputError{path, std::nullopt, Xlate("the file cannot be read: %1").arg(bytes->file_.errorString())};
+    }
+    const qint64 size = bytes->file_.size();
+    if (const uchar *mapped = size > 0 ? bytes->file_.map(0, size) : nullptr) {
+        bytes->view_ = {reinterpret_cast<const char *>(mapped), static_cast<std::size_t>(size)};
+        return std::shared_ptr<const FileBytes>(std::move(bytes));
+    }
+    bytes->content_ = bytes->file_.readAll();
+    if (bytes->file_.error() != QFileDevice::NoError) {
+        return InputError{path, std::nullopt, Xlate("the file cannot be read: %1").arg(bytes->file_.errorString())};
+    }
+    bytes->view_ = {bytes->content_.constData(), static_cast<std::size_t>(bytes->content_.size())};
+    return std::shared_ptr<const FileBytes>(std::move(bytes));
+}
+
+CsvReader::CsvReader(const QString &path, std::string_view bytes, char delimiter)
+    : path_(path), bytes_(bytes), delimiter_(delimiter)
+{
+    std::fill(classes_.begin() + 0x80, classes_.end(), high);
+    for (const char character : {delimiter, '"', '\r', '\n', '\0'}) {
+        classes_[static_cast<unsigned char>(character)] = special;
+    }
+    if (bytes_.starts_with(byteOrderMark)) {
+        position_ = byteOrderMark.size();
+    }
+}
+
+void CsvReader::seek(std::size_t rowStart, qsizetype line)
+{
+    position_ = rowStart;
+    line_ = line;
+    error_.reset();
+}
+
+bool CsvReader::next()
+{
+    if (error_ || skipEmptyEnd()) {
+        return false;
+    }
+    rowStart_ = position_;
+    rowLine_ = line_;
+    rawCells_.clear();
+    hasHighBytes_ = false;
+    if (!scanRow()) {
+        return false;
+    }
+    const std::string_view row = bytes_.substr(rowStart_, position_ - rowStart_);
+    if (hasHighBytes_ && !isUtf8(row)) {
+        std::size_t good = 0;
+        while (good < row.size()) {
+            // The longest valid beginning ends before the first byte that is no part of a character.
+            const unsigned char lead = static_cast<unsigned char>(row[good]);
+            const std::size_t length = lead < 0x80 ? 1 : lead < 0xE0 ? 2 : lead < 0xF0 ? 3 : 4;
+            if (!isUtf8(row.substr(good, length))) {
+                break;
+            }
+            good += length;
+        }
+        return fail(rowStart_ + good, Xlate("the file is not UTF-8"));
+    }
+    takeCells();
+    return true;
+}
+
+/// Blank lines at the end of the file are no rows.
+bool CsvReader::skipEmptyEnd()
+{
+    const std::size_t text = bytes_.find_first_not_of("\r\n", position_);
+    if (text == std::string_view::npos) {
+        position_ = bytes_.size();
+    }
+    return position_ == bytes_.size();
+}
+
+bool CsvReader::scanRow()
+{
+    const std::size_t limit = std::min(bytes_.size(), rowStart_ + longestRow);
+    std::size_t cellStart = position_;
+    std::size_t at = position_;
+    while (at < limit) {
+        const unsigned char kind = classes_[static_cast<unsigned char>(bytes_[at])];
+        if (kind != special) {
+            hasHighBytes_ |= kind == high;
+            ++at;
+            continue;
+        }
+        const char character = bytes_[at];
+        if (character == delimiter_) {
+            rawCells_.push_back({cellStart, at, false, false});
+            cellStart = ++at;
+        } else if (character == '\n' || character == '\r') {
+            rawCells_.push_back({cellStart, at, false, false});
+            return endRow(at);
+        } else if (character == '"' && at == cellStart) {
+            position_ = at;
+            if (!scanQuoted(limit)) {
+                return false;
+            }
+            at = position_;
+            if (at == bytes_.size() || bytes_[at] == '\n' || bytes_[at] == '\r') {
+                return endRow(at);
+            }
+            if (bytes_[at] != delimiter_) {
+                return fail(at, Xlate("a delimiter was expected behind the closing quote"));
+            }
+            cellStart = ++at;
+        } else if (character == '"') {
+            return fail(at, Xlate("a quote inside a cell was not expected: the whole cell must stand in quotes and the "
+                                  "quote be doubled"));
+        } else {
+            return fail(at, Xlate("a zero byte stands in the file: a text file was expected"));
+        }
+    }
+    if (at < bytes_.size()) {
+        return fail(rowStart_, Xlate("the line is longer than %1 bytes: a table of rows was expected").arg(longestRow));
+    }
+    rawCells_.push_back({cellStart, at, false, false});
+    return endRow(at);
+}
+
+/// Reads a quoted cell from its opening quote to behind its closing one.
+bool CsvReader::scanQuoted(std::size_t limit)
+{
+    const std::size_t opening = position_;
+    bool doubled = false;
+    for (std::size_t at = opening + 1; at < limit; ++at) {
+        const char character = bytes_[at];
+        if (character == '"') {
+            if (at + 1 < bytes_.size() && bytes_[at + 1] == '"') {
+                doubled = true;
+                ++at;
+                continue;
+            }
+            rawCells_.push_back({opening + 1, at, doubled, true});
+            position_ = at + 1;
+            return true;
+        }
+        if (character == '\n') {
+            ++line_;
+        } else if (character == '\0') {
+            return fail(at, Xlate("a zero byte stands in the file: a text file was expected"));
+        }
+        hasHighBytes_ |= static_cast<unsigned char>(character) >= 0x80;
+    }
+    return fail(opening, Xlate("the quoted cell has no closing quote"));
+}
+
+bool CsvReader::endRow(std::size_t end)
+{
+    position_ = end;
+    if (end < bytes_.size() && bytes_[end] == '\r') {
+        if (end + 1 < bytes_.size() && bytes_[end + 1] != '\n') {
+            return fail(end, Xlate("a carriage return without a line feed was not expected"));
+        }
+        ++position_;
+    }
+    if (position_ < bytes_.size()) {
+        ++position_;
+    }
+    ++line_;
+    return true;
+}
+
+void CsvReader::takeCells()
+{
+    cells_.clear();
+    std::size_t undoubled = 0;
+    for (const RawCell &raw : rawCells_) {
+        const std::string_view text = bytes_.substr(raw.begin, raw.end - raw.begin);
+        if (!raw.doubledQuotes) {
+            cells_.push_back(text);
+            continue;
+        }
+        // The texts of a row must not move while cells point into them.
+        if (unquoted_.size() < rawCells_.size()) {
+            unquoted_.resize(rawCells_.size());
+        }
+        std::string &single = unquoted_[undoubled++];
+        single.clear();
+        for (std::size_t i = 0; i < text.size(); ++i) {
+            single += text[i];
+            i += text[i] == '"' ? 1U : 0U;
+        }
+        cells_.push_back(single);
+    }
+}
+
+TextPlace CsvReader::placeOf(std::size_t at) const
+{
+    const std::string_view before = bytes_.substr(rowStart_, at - rowStart_);
+    const auto lines = std::count(before.begin(), before.end(), '\n');
+    const std::size_t lineStart = lines == 0 ? 0 : before.rfind('\n') + 1;
+    const std::string_view line = before.substr(lineStart);
+    const auto characters =
+        std::count_if(line.begin(), line.end(), [](char byte) { return (static_cast<unsigned char>(byte) & 0xC0) != 0x80; });
+    return {rowLine_ + lines, characters + 1};
+}
+
+TextPlace CsvReader::placeOfCell(std::size_t cell) const
+{
+    const RawCell &raw = rawCells_[std::min(cell, rawCells_.size() - 1)];
+    return placeOf(raw.quoted ? raw.begin - 1 : raw.begin);
+}
+
+bool CsvReader::fail(std::size_t at, const QString &text)
+{
+    error_ = errorAt(placeOf(at), text);
+    return false;
+}
+
+} // namespace kareport

@@ -1,0 +1,97 @@
+#pragma once
+
+#include "InputError.h"
+
+#include <QFile>
+#include <QString>
+
+#include <array>
+#include <cstddef>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace kareport
+{
+
+/// The bytes of a file, mapped where the system can, so that a large file is never in memory as a whole.
+class FileBytes
+{
+public:
+    static Expected<std::shared_ptr<const FileBytes>> open(const QString &path);
+
+    std::string_view view() const { return view_; }
+    const QString &path() const { return path_; }
+
+private:
+    QString path_;
+    QFile file_;
+    QByteArray content_; ///< of a file that cannot be mapped
+    std::string_view view_;
+};
+
+/// Reads a CSV text (RFC 4180, UTF-8 with or without a byte-order mark) row by row, in one pass.
+class CsvReader
+{
+public:
+    /// Longer rows are taken for something that is no CSV.
+    static constexpr std::size_t longestRow = std::size_t(1) << 20;
+
+    /// @param path  names the file in errors
+    CsvReader(const QString &path, std::string_view bytes, char delimiter);
+
+    /// Reads the next row. @return false at the end, and when something is wrong with the row
+    bool next();
+    const std::optional<InputError> &error() const { return error_; }
+
+    /// The cells of the row; valid until the next call of `next`.
+    const std::vector<std::string_view> &cells() const { return cells_; }
+    /// Where the row begins: a position for `seek`.
+    std::size_t rowStart() const { return rowStart_; }
+    qsizetype rowLine() const { return rowLine_; }
+    /// The line that the next row begins in.
+    qsizetype nextLine() const { return line_; }
+    /// Where reading has come to.
+    std::size_t position() const { return position_; }
+
+    /// Continues at the start of a row that was read before.
+    void seek(std::size_t rowStart, qsizetype line);
+
+    /// The place of a cell of the row.
+    TextPlace placeOfCell(std::size_t cell) const;
+    InputError errorAt(TextPlace place, const QString &text) const { return {path_, place, text}; }
+
+private:
+    struct RawCell
+    {
+        std::size_t begin;
+        std::size_t end;
+        bool doubledQuotes;
+        bool quoted;
+    };
+
+    bool scanRow();
+    bool scanQuoted(std::size_t limit);
+    bool endRow(std::size_t end);
+    void takeCells();
+    bool skipEmptyEnd();
+    bool fail(std::size_t at, const QString &text);
+    TextPlace placeOf(std::size_t at) const;
+
+    QString path_;
+    std::string_view bytes_;
+    char delimiter_;
+    std::size_t position_ = 0;
+    std::size_t rowStart_ = 0;
+    qsizetype line_ = 1;
+    qsizetype rowLine_ = 1;
+    bool hasHighBytes_ = false;
+    std::vector<RawCell> rawCells_;
+    std::vector<std::string_view> cells_;
+    std::vector<std::string> unquoted_;
+    std::optional<InputError> error_;
+    std::array<unsigned char, 256> classes_{};
+};
+
+} // namespace kareport

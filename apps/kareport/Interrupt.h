@@ -1,0 +1,10 @@
+#pragma once
+
+namespace kareport
+{
+
+/// Lets an interrupt from the keyboard, or a request to end, stop the work at the next safe point instead of at once.
+void catchInterrupts();
+bool isInterrupted();
+
+} // namespace kareport

@@ -1,0 +1,115 @@
+#pragma once
+
+#include "DataUnits.h"
+#include "DefaultPrinter.h"
+#include "JsonPlaces.h"
+#include "OutputKind.h"
+#include "UJobSettings.h"
+
+#include <QDateTime>
+#include <QHash>
+#include <QMargins>
+#include <QString>
+
+#include <optional>
+#include <variant>
+#include <vector>
+
+namespace kareport
+{
+
+/// What a report is made of: a job file that has been read, or the short form of the command line. File names are
+/// complete.
+struct Job
+{
+    struct Page
+    {
+        DefaultPrinter printer{PrinterSource::BuiltIn, PaperSize::A4, 600};
+        bool portrait = true;
+        std::optional<QMargins> margins; ///< hundredths of a millimetre
+        std::optional<QString> fontName;
+        std::optional<int> fontSize; ///< points
+        std::optional<int> linesPerPage;
+        std::optional<int> charsPerRow;
+    };
+    struct Template
+    {
+        QString file;
+        QString name;
+    };
+    struct Options
+    {
+        bool zeroBlank = false;
+        bool writeTableName = false;
+        bool printHash = false;
+        bool excel = false;
+        std::optional<QString> chainageLabel;
+        std::optional<char16_t> separator;
+    };
+    struct DataSet
+    {
+        QString csv; ///< empty when the values stand in the job
+        char delimiter = ',';
+        DataUnits units;
+    };
+
+    struct Heading
+    {
+        QString text;
+        int before;
+        int after;
+    };
+    struct Line
+    {
+        QString text;
+        int before;
+        int after;
+        int style;
+    };
+    struct LineFeed
+    {
+        int count;
+    };
+    struct NewPage
+    {
+        int linesNeeded;
+    };
+    struct Block
+    {
+        QString name;
+        QString data;
+        int before;
+        int after;
+    };
+    struct Table
+    {
+        QString name;
+        QString data;
+        int before;
+        int after;
+        int headingAfter;
+    };
+    struct Clear
+    {
+    };
+    struct Step
+    {
+        std::variant<Heading, Line, LineFeed, NewPage, Block, Table, Clear> action;
+        JsonPath path; ///< in the job file, for messages
+    };
+
+    QString folder; ///< the job file's
+    std::optional<QString> title;
+    QString application = QStringLiteral("TALVEN");
+    bool header = true;
+    std::optional<QDateTime> now;
+    Page page;
+    UJobSettings settings;
+    std::optional<Template> reportTemplate;
+    Options options;
+    QHash<QString, DataSet> data;
+    std::vector<Step> steps;
+    std::vector<Output> outputs;
+};
+
+} // namespace kareport

@@ -1,0 +1,17 @@
+#pragma once
+
+#include "Job.h"
+#include "JsonNode.h"
+
+namespace kareport
+{
+
+/// Reads a job file's content. What is wrong with it fails the source; the job that comes back then is no use.
+Job readJob(JsonSource &source);
+
+/// Reads the host's settings by their keys.
+UJobSettings readSettings(const JsonNode &node);
+/// Reads the units of a data set.
+DataUnits readDataUnits(const JsonNode &node);
+
+} // namespace kareport

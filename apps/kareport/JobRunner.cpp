@@ -1,0 +1,274 @@
+#include "JobRunner.h"
+
+#include "ApplicationTitle.h"
+#include "Clock.h"
+#include "CsvObjectList.h"
+#include "Folders.h"
+#include "Interrupt.h"
+#include "JsonObjectList.h"
+#include "Preferences.h"
+#include "Profile.h"
+#include "ReportEntry.h"
+#include "ReportMargins.h"
+#include "TemplateSource.h"
+#include "Xlate.h"
+
+#include <QDir>
+#include <QFileInfo>
+
+namespace kareport
+{
+
+namespace
+{
+
+/// The time that a reproducible build gives its programs, if one does.
+std::optional<QDateTime> buildTime()
+{
+    bool isNumber = false;
+    const qint64 seconds = qEnvironmentVariable("SOURCE_DATE_EPOCH").toLongLong(&isNumber);
+    return isNumber ? std::optional(QDateTime::fromSecsSinceEpoch(seconds, Qt::UTC)) : std::nullopt;
+}
+
+} // namespace
+
+/// Carries out the steps of a job, one after the other.
+class JobRunner::Steps
+{
+public:
+    explicit Steps(JobRunner &runner) : runner_(runner), report_(*runner.report_) {}
+
+    std::optional<InputError> run()
+    {
+        for (const Job::Step &step : runner_.job_.steps) {
+            path_ = step.path;
+            std::visit(*this, step.action);
+            if (error_ || runner_.source_.failed() || isInterrupted()) {
+                break;
+            }
+        }
+        return error_ ? error_ : runner_.source_.error();
+    }
+
+    void operator()(const Job::Heading &step) { report_.SetHeading(step.text, step.before, step.after); }
+    void operator()(const Job::Line &step) { report_.WriteLine(step.text, step.before, step.after, step.style); }
+    void operator()(const Job::LineFeed &step) { report_.LineFeed(step.count); }
+    void operator()(const Job::NewPage &step) { report_.NewPage(step.linesNeeded); }
+    void operator()(const Job::Clear & /*step*/) { report_.Clear(); }
+
+    void operator()(const Job::Block &step)
+    {
+        const sXmlReportBlock *block = report_.GetTemplate()->GetBlock(step.name);
+        if (!isWritable(block, step.name, Xlate("block"), [](const UXmlReportTpl &tpl, QStringList &names) { tpl.GetAllBlocks(names); })) {
+            return;
+        }
+        const auto list = openData(step.data, block->Use, true);
+        const UDataObject *object = list ? list->GetAt(0) : nullptr;
+        if (!takeError(list.get()) && list && object == nullptr) {
+            runner_.source_.fail(path_, Xlate("the data \"%1\" has no row: a block shows the first one").arg(step.data));
+        }
+        if (object != nullptr && !failed()) {
+            report_.WriteDataBlock(step.name, object, step.before, step.after);
+        }
+    }
+
+    void operator()(const Job::Table &step)
+    {
+        const sXmlReportTable *table = report_.GetTemplate()->GetTable(step.name);
+        if (!isWritable(table, step.name, Xlate("table"), [](const UXmlReportTpl &tpl, QStringList &names) { tpl.GetAllTables(names); })) {
+            return;
+        }
+        const auto list = openData(step.data, table->Use, false);
+        if (list && !takeError(list.get()) && !failed()) {
+            report_.WriteDataTable(step.name, list.get(), step.before, step.after, step.headingAfter);
+            takeError(list.get());
+        }
+    }
+
+private:
+    bool failed() const { return error_ || runner_.source_.failed(); }
+
+    template <typename Record, typename GetNames>
+    bool isWritable(const Record *record, const QString &name, const QString &what, GetNames getNames)
+    {
+        const UXmlReportTpl &tpl = *report_.GetTemplate();
+        if (record == nullptr) {
+            QStringList names;
+            getNames(tpl, names);
+            runner_.source_.fail(path_, Xlate("the template has no %1 named \"%2\": one of %3 was expected")
+                                            .arg(what, name, names.isEmpty() ? Xlate("none") : names.join(QStringLiteral(", "))));
+            return false;
+        }
+        if (tpl.GetDictionary(record->Use) == nullptr) {
+            runner_.source_.fail(path_, Xlate("the %1 \"%2\" cannot be written: the template has no dictionary named \"%3\"")
+                                            .arg(what, name, record->Use));
+            return false;
+        }
+        return true;
+    }
+
+    /// The rows of a data set, typed by a dictionary of the template.
+    std::unique_ptr<UDataObjectList> openData(const QString &name, const QString &dictionary, bool firstOnly)
+    {
+        const Job::DataSet &set = *runner_.job_.data.constFind(name);
+        const UXmlReportTpl *tpl = report_.GetTemplate();
+        const FindVariable findVariable = [tpl, &set, dictionary](const QString &variable) -> std::optional<ValueParser> {
+            qint32 id = 0;
+            qint32 type = 0;
+            if (!tpl->FindVariable(dictionary, variable, id, type)) {
+                return std::nullopt;
+            }
+            return ValueParser(type, static_cast<unsigned>(id), set.units);
+        };
+        return set.csv.isEmpty() ? readValues(name, findVariable, firstOnly) : openCsv(set, findVariable);
+    }
+
+    std::unique_ptr<UDataObjectList> openCsv(const Job::DataSet &set, const FindVariable &findVariable)
+    {
+        auto file = FileBytes::open(set.csv);
+        if (const InputError *error = errorOf(file)) {
+            error_ = *error;
+            return nullptr;
+        }
+        const auto &bytes = std::get<std::shared_ptr<const FileBytes>>(file);
+        Progress &progress = runner_.progress_;
+        progress.begin(Xlate("Reading %1").arg(QFileInfo(set.csv).fileName()), bytes->view().size());
+        return std::make_unique<CsvObjectList>(bytes, set.delimiter, findVariable, [&progress](std::size_t read) {
+            progress.advance(read);
+            return !isInterrupted();
+        });
+    }
+
+    std::unique_ptr<UDataObjectList> readValues(const QString &name, const FindVariable &findVariable, bool firstOnly)
+    {
+        const JsonNode values = JsonNode(runner_.source_)["data"][name]["values"];
+        auto list = std::make_unique<UDataObjectList>();
+        if (values.isObject()) {
+            storeJsonObject(values, findVariable, list->Add());
+            return list;
+        }
+        for (qsizetype i = 0; i < (firstOnly ? qMin<qsizetype>(values.size(), 1) : values.size()); ++i) {
+            storeJsonObject(values[i], findVariable, list->Add());
+        }
+        return list;
+    }
+
+    bool takeError(UDataObjectList *list)
+    {
+        const auto *csv = dynamic_cast<const CsvObjectList *>(list);
+        if (csv != nullptr && csv->error()) {
+            error_ = csv->error();
+        }
+        return error_.has_value();
+    }
+
+    JobRunner &runner_;
+    UReportDoc &report_;
+    JsonPath path_;
+    std::optional<InputError> error_;
+};
+
+JobRunner::JobRunner(const Job &job, JsonSource &source, Progress &progress)
+    : job_(job), source_(source), progress_(progress)
+{
+    application_.AddDocTemplate(ReportInitialTemplate());
+}
+
+JobRunner::~JobRunner() = default;
+
+std::optional<InputError> JobRunner::run()
+{
+    if (auto error = prepare()) {
+        return error;
+    }
+    return Steps(*this).run();
+}
+
+std::optional<InputError> JobRunner::prepare()
+{
+    // What is printed must not depend on the preferences of whoever runs the job.
+    setProfileStore(makeMemoryProfile());
+    WriteProfileString(QString(), QStringLiteral("ReportPrintHash"), job_.options.printHash ? QStringLiteral("1") : QStringLiteral("0"));
+    if (job_.page.margins) {
+        WriteProfileString(QString(), QStringLiteral("Report Margins"), marginsToText(*job_.page.margins));
+    }
+    if (job_.page.fontSize) {
+        SetReportFontSize(static_cast<unsigned>(*job_.page.fontSize));
+    }
+    SetReportPrinterToPortrait(job_.page.portrait);
+    setStartPathName(job_.folder);
+    SetApplicationTitle(job_.application);
+    fixTime(job_.now ? job_.now : buildTime());
+
+    // No page is measured before the face is known.
+    setDefaultPrinter({PrinterSource::None});
+    report_ = CreateReport(job_.title.value_or(QString()), job_.header, false, nullptr, 0, nullptr);
+    if (report_ == nullptr) {
+        return InputError{source_.path(), std::nullopt, Xlate("the report could not be made")};
+    }
+    DefaultPrinter printer = job_.page.printer;
+    if (!needsFonts(job_)) {
+        printer.source = PrinterSource::BuiltIn; // the page is fixed: no printer is asked
+    }
+    setDefaultPrinter(printer);
+    if (job_.page.fontName) {
+        report_->SetFontName(*job_.page.fontName);
+    }
+    report_->FixPage(job_.page.linesPerPage, job_.page.charsPerRow);
+    report_->SetPageSize();
+    if (report_->GetLinesPerPage() < 1 || report_->GetCharsPerRow() < 1) {
+        const JsonNode page = JsonNode(source_)["page"];
+        page.fail(Xlate("the margins leave no room on the page: smaller margins or a smaller font were expected"));
+        return source_.error();
+    }
+    report_->SetJobSettings(job_.settings);
+    if (auto error = loadTemplate()) {
+        return error;
+    }
+    applyOptions();
+    if (job_.title) {
+        report_->SetTitle(*job_.title);
+    }
+    report_->SetHeader();
+    return std::nullopt;
+}
+
+std::optional<InputError> JobRunner::loadTemplate()
+{
+    if (!job_.reportTemplate) {
+        return std::nullopt;
+    }
+    // The job's own file wins over an installed one of the same name.
+    const QString own = QDir(job_.folder).filePath(job_.reportTemplate->file);
+    const QString installed = QDir(GetLibraryDir(false)).filePath(job_.reportTemplate->file);
+    const QString path = QFileInfo::exists(own) || !QFileInfo::exists(installed) ? own : installed;
+    const auto file = readTemplateSource(path);
+    if (const InputError *error = errorOf(file)) {
+        return *error;
+    }
+    const QFileInfo info(path);
+    setLibraryDir(info.absolutePath());
+    setStartPathName(info.absolutePath());
+    const bool loaded = report_->LoadTemplateXml(info.fileName(), job_.reportTemplate->name, QString(), QString());
+    setLibraryDir(QString());
+    setStartPathName(job_.folder);
+    return loaded ? std::nullopt
+                  : std::optional(whyNotLoaded(path, std::get<TemplateFile>(file), job_.reportTemplate->name));
+}
+
+void JobRunner::applyOptions()
+{
+    report_->SetZeroBlank(job_.options.zeroBlank);
+    report_->WriteTableName(job_.options.writeTableName);
+    if (job_.options.chainageLabel) {
+        report_->SetChainageLabel(*job_.options.chainageLabel);
+    }
+    if (job_.options.excel) {
+        report_->SetExcelFormat();
+    }
+    if (job_.options.separator) {
+        report_->SetDataColumnSeparator(*job_.options.separator, false);
+    }
+}
+
+} // namespace kareport

@@ -1,0 +1,44 @@
+#pragma once
+
+#include "InputError.h"
+#include "Job.h"
+#include "JsonNode.h"
+#include "Progress.h"
+#include "UApplication.h"
+#include "UReportDoc.h"
+
+#include <memory>
+
+namespace kareport
+{
+
+/// Makes the report that a job describes.
+class JobRunner
+{
+public:
+    /// @param source  the job file, for its values and for the places of errors
+    JobRunner(const Job &job, JsonSource &source, Progress &progress);
+    ~JobRunner();
+
+    /// Whether a page has to be measured with a font, which needs a running QGuiApplication.
+    static bool needsFonts(const Job &job) { return !job.page.linesPerPage || !job.page.charsPerRow; }
+
+    /// @return what is wrong with the job's template or data; nothing when the report has been made or was interrupted
+    std::optional<InputError> run();
+    UReportDoc &report() { return *report_; }
+
+private:
+    class Steps;
+
+    std::optional<InputError> prepare();
+    std::optional<InputError> loadTemplate();
+    void applyOptions();
+
+    const Job &job_;
+    JsonSource &source_;
+    Progress &progress_;
+    UApplication application_;
+    UReportDoc *report_ = nullptr; ///< owned by its document template
+};
+
+} // namespace kareport

@@ -1,0 +1,244 @@
+#include "JsonNode.h"
+
+#include "Xlate.h"
+
+#include <QFile>
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
+#include <QStringList>
+
+#include <algorithm>
+#include <cmath>
+
+namespace kareport
+{
+
+namespace
+{
+
+QString withDots(const JsonPath &path)
+{
+    QStringList steps;
+    for (const auto &step : path) {
+        if (const auto *name = std::get_if<QString>(&step)) {
+            steps.append(*name);
+        } else {
+            steps.append(QString::number(std::get<qsizetype>(step)));
+        }
+    }
+    return steps.join(u'.');
+}
+
+QJsonValue parsedOrText(const QString &text)
+{
+    QJsonParseError error{};
+    const auto document = QJsonDocument::fromJson('[' + text.toUtf8() + ']', &error);
+    return error.error == QJsonParseError::NoError && document.array().size() == 1 ? document.array().first()
+                                                                                   : QJsonValue(text);
+}
+
+/// The value with another one where the steps lead; nothing when they lead nowhere.
+std::optional<QJsonValue> withValueAt(const QJsonValue &value, const QStringList &steps, const QJsonValue &inner)
+{
+    if (steps.isEmpty()) {
+        return inner;
+    }
+    const QString &step = steps.first();
+    if (value.isArray()) {
+        QJsonArray array = value.toArray();
+        bool isIndex = false;
+        const int index = step.toInt(&isIndex);
+        if (!isIndex || index < 0 || index >= array.size()) {
+            return std::nullopt;
+        }
+        const auto changed = withValueAt(array.at(index), steps.mid(1), inner);
+        if (!changed) {
+            return std::nullopt;
+        }
+        array.replace(index, *changed);
+        return array;
+    }
+    if (!value.isObject() && !value.isUndefined()) {
+        return std::nullopt;
+    }
+    QJsonObject object = value.toObject();
+    const auto changed = withValueAt(object.value(step), steps.mid(1), inner);
+    if (!changed) {
+        return std::nullopt;
+    }
+    object.insert(step, *changed);
+    return object;
+}
+
+} // namespace
+
+Expected<JsonSource> JsonSource::read(const QString &path)
+{
+    QFile file(path);
+    if (!file.open(QIODevice::ReadOnly)) {
+        return InputError{path, std::nullopt, Xlate("the file cannot be read: %1").arg(file.errorString())};
+    }
+    return fromBytes(path, file.readAll());
+}
+
+Expected<JsonSource> JsonSource::fromBytes(const QString &path, const QByteArray &bytes)
+{
+    QJsonParseError parseError{};
+    const auto document = QJsonDocument::fromJson(bytes, &parseError);
+    if (parseError.error != QJsonParseError::NoError) {
+        return InputError{path, placeOfByte(bytes, parseError.offset),
+                          Xlate("a JSON object was expected: %1").arg(parseError.errorString())};
+    }
+    if (!document.isObject()) {
+        return InputError{path, TextPlace(), Xlate("a JSON object was expected")};
+    }
+    JsonSource source;
+    source.path_ = path;
+    source.bytes_ = bytes;
+    source.root_ = document.object();
+    return source;
+}
+
+JsonSource JsonSource::fromObject(const QJsonObject &object)
+{
+    JsonSource source;
+    source.root_ = object;
+    return source;
+}
+
+std::optional<QString> JsonSource::set(const QString &key, const QString &text)
+{
+    const QStringList steps = key.split(u'.');
+    const auto changed = steps.contains(QString()) ? std::nullopt : withValueAt(root_, steps, parsedOrText(text));
+    if (!changed) {
+        return Xlate("there is no place for the key \"%1\" in the job").arg(key);
+    }
+    root_ = *changed;
+    setTexts_.insert(key, text);
+    return std::nullopt;
+}
+
+std::optional<QString> JsonSource::setText(const JsonPath &path) const
+{
+    const auto found = setTexts_.constFind(withDots(path));
+    return found == setTexts_.constEnd() ? std::nullopt : std::optional(*found);
+}
+
+void JsonSource::fail(const JsonPath &path, const QString &text, bool atKey)
+{
+    if (error_) {
+        return;
+    }
+    if (const auto given = setText(path)) {
+        error_ = InputError{QStringLiteral("--set %1=%2").arg(withDots(path), *given), std::nullopt, text};
+        return;
+    }
+    // What is missing is missed where its parent stands.
+    JsonPath known = path;
+    auto place = placeInJson(bytes_, known, atKey);
+    while (!place && !known.empty()) {
+        known.pop_back();
+        place = placeInJson(bytes_, known);
+    }
+    error_ = InputError{path_, place, text};
+}
+
+JsonNode JsonNode::operator[](const QString &key) const
+{
+    JsonPath path = path_;
+    path.emplace_back(key);
+    return {source_, value_.toObject().value(key), std::move(path)};
+}
+
+JsonNode JsonNode::operator[](qsizetype index) const
+{
+    JsonPath path = path_;
+    path.emplace_back(index);
+    return {source_, value_.toArray().at(index), std::move(path)};
+}
+
+qsizetype JsonNode::size() const
+{
+    return value_.toArray().size();
+}
+
+QStringList JsonNode::keys() const
+{
+    return value_.toObject().keys();
+}
+
+bool JsonNode::isText() const
+{
+    return value_.isString() || (exists() && source_.setText(path_));
+}
+
+QString JsonNode::text(const QString &fallback) const
+{
+    if (!exists()) {
+        return fallback;
+    }
+    if (const auto given = source_.setText(path_)) {
+        return value_.isString() ? value_.toString() : *given;
+    }
+    if (!value_.isString()) {
+        fail(Xlate("a text was expected"));
+        return fallback;
+    }
+    return value_.toString();
+}
+
+bool JsonNode::boolean(bool fallback) const
+{
+    if (exists() && !value_.isBool()) {
+        fail(Xlate("true or false was expected"));
+    }
+    return value_.toBool(fallback);
+}
+
+int JsonNode::whole(int fallback, int least, int most) const
+{
+    if (!exists()) {
+        return fallback;
+    }
+    const double number = value_.toDouble();
+    if (!value_.isDouble() || number != std::floor(number) || number < least || number > most) {
+        fail(Xlate("a whole number from %1 to %2 was expected").arg(least).arg(most));
+        return fallback;
+    }
+    return static_cast<int>(number);
+}
+
+bool JsonNode::expectObject() const
+{
+    if (exists() && !value_.isObject()) {
+        fail(Xlate("an object was expected"));
+    }
+    return value_.isObject();
+}
+
+bool JsonNode::expectArray() const
+{
+    if (exists() && !value_.isArray()) {
+        fail(Xlate("a list was expected"));
+    }
+    return value_.isArray();
+}
+
+void JsonNode::allowOnly(std::initializer_list<const char *> allowed) const
+{
+    for (const QString &key : keys()) {
+        const bool known = std::any_of(allowed.begin(), allowed.end(),
+                                       [&](const char *name) { return key == QLatin1StringView(name); });
+        if (!known) {
+            QStringList names;
+            std::transform(allowed.begin(), allowed.end(), std::back_inserter(names),
+                           [](const char *name) { return QString::fromLatin1(name); });
+            JsonPath path = path_;
+            path.emplace_back(key);
+            source_.fail(path, Xlate("unknown key \"%1\": %2 expected").arg(key, names.join(QStringLiteral(", "))), true);
+        }
+    }
+}
+
+} // namespace kareport

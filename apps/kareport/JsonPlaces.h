@@ -1,0 +1,25 @@
+#pragma once
+
+#include "TextPlaces.h"
+
+#include <QByteArray>
+#include <QString>
+
+#include <optional>
+#include <variant>
+#include <vector>
+
+namespace kareport
+{
+
+/// The way from a JSON document's root to a value: names of members and indices of elements.
+using JsonPath = std::vector<std::variant<QString, qsizetype>>;
+
+/// Where a value (or, with `ofKey`, the name of the member that holds it) stands in a JSON text that has been parsed
+/// already. Of members of one name the last counts. Nothing when the path does not exist.
+std::optional<TextPlace> placeInJson(const QByteArray &json, const JsonPath &path, bool ofKey = false);
+
+/// The place of a byte in a UTF-8 text.
+TextPlace placeOfByte(const QByteArray &text, qsizetype byte);
+
+} // namespace kareport

@@ -1,0 +1,33 @@
+#pragma once
+
+#include <QString>
+
+#include <optional>
+
+namespace kareport
+{
+
+/// What a report is written as.
+enum class OutputKind
+{
+    Report, ///< a report file
+    Text    ///< plain text, UTF-8
+};
+
+/// The kind of a name such as "rep".
+std::optional<OutputKind> outputKindFromName(const QString &name);
+/// The kind that a file name's ending says; "-" is text.
+std::optional<OutputKind> outputKindFromFile(const QString &file);
+/// The names of all kinds, for messages.
+QString outputKindNames();
+
+/// Where a report goes.
+struct Output
+{
+    QString file; ///< "-" for standard output
+    OutputKind kind = OutputKind::Text;
+
+    bool isStandardOutput() const { return file == u"-"; }
+};
+
+} // namespace kareport

@@ -1,0 +1,43 @@
+#include "OutputWriter.h"
+
+#include "ReplaceFile.h"
+#include "Xlate.h"
+
+#include <QFile>
+
+#include <cstdio>
+
+namespace kareport
+{
+
+namespace
+{
+
+LineEnds lineEndsOf(OutputKind kind)
+{
+    return kind == OutputKind::Report ? LineEnds::ReportFile : LineEnds::PlainText;
+}
+
+} // namespace
+
+std::optional<QString> writeOutput(UReportDoc &report, const Output &output)
+{
+    const QStringView text = report.GetText();
+    const LineEnds lineEnds = lineEndsOf(output.kind);
+    if (output.isStandardOutput()) {
+        QFile file;
+        const bool done = file.open(stdout, QIODevice::WriteOnly) && writeReportText(file, text, lineEnds) && file.flush();
+        return done ? std::nullopt
+                    : std::optional(Xlate("the report could not be written to standard output: %1").arg(file.errorString()));
+    }
+    if (output.kind == OutputKind::Report && text.isEmpty()) {
+        // Saving an empty report makes no file.
+        return std::nullopt;
+    }
+    QString error;
+    const bool done = replaceFile(
+        output.file, [&](QIODevice &device) { return writeReportText(device, text, lineEnds); }, &error);
+    return done ? std::nullopt : std::optional(Xlate("\"%1\" could not be written: %2").arg(output.file, error));
+}
+
+} // namespace kareport

@@ -1,0 +1,51 @@
+#include "Progress.h"
+
+#include <algorithm>
+#include <cstdio>
+
+namespace kareport
+{
+
+namespace
+{
+constexpr qint64 millisecondsBetween = 100;
+}
+
+void Progress::begin(const QString &what, std::size_t total)
+{
+    what_ = what;
+    total_ = total;
+    if (shown_) {
+        show(0);
+    }
+}
+
+void Progress::advance(std::size_t done)
+{
+    if (shown_ && sinceShown_.elapsed() >= millisecondsBetween) {
+        show(done);
+    }
+}
+
+void Progress::show(std::size_t done)
+{
+    sinceShown_.start();
+    QString line = what_;
+    if (total_ > 0) {
+        line += QStringLiteral(" %1 %").arg(std::min(done, total_) * 100 / total_);
+    }
+    std::fprintf(stderr, "\r%s", qUtf8Printable(line.leftJustified(width_)));
+    std::fflush(stderr);
+    width_ = std::max(width_, line.size());
+}
+
+void Progress::finish()
+{
+    if (width_ > 0) {
+        std::fprintf(stderr, "\r%s\r", qUtf8Printable(QString(width_, u' ')));
+        std::fflush(stderr);
+        width_ = 0;
+    }
+}
+
+} // namespace kareport

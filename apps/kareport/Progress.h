@@ -1,0 +1,37 @@
+#pragma once
+
+#include <QElapsedTimer>
+#include <QString>
+
+#include <cstddef>
+
+namespace kareport
+{
+
+/// Shows on standard error how far long work has come.
+class Progress
+{
+public:
+    explicit Progress(bool shown) : shown_(shown) {}
+    ~Progress() { finish(); }
+    Progress(const Progress &) = delete;
+    Progress &operator=(const Progress &) = delete;
+
+    /// Begins a piece of work. @param total  what `advance` counts to; 0 when that is not known
+    void begin(const QString &what, std::size_t total);
+    /// Shows how much is done, a few times a second at most.
+    void advance(std::size_t done);
+    /// Takes the line off the screen.
+    void finish();
+
+private:
+    void show(std::size_t done);
+
+    bool shown_;
+    QString what_;
+    std::size_t total_ = 0;
+    QElapsedTimer sinceShown_;
+    qsizetype width_ = 0;
+};
+
+} // namespace kareport

@@ -1,0 +1,47 @@
+#include "TemplateSource.h"
+
+#include "TemplateCheck.h"
+#include "TemplateNames.h"
+#include "Xlate.h"
+
+#include <QFileInfo>
+
+namespace kareport
+{
+
+Expected<TemplateFile> readTemplateSource(const QString &path)
+{
+    const QFileInfo info(path);
+    if (!info.exists() || info.isDir()) {
+        return InputError{path, std::nullopt, Xlate("the template file cannot be read: there is no such file")};
+    }
+    if (info.size() > largestTemplateFile) {
+        return InputError{path, TextPlace(),
+                          Xlate("the template file has %1 MB: at most %2 MB were expected")
+                              .arg(info.size() >> 20)
+                              .arg(largestTemplateFile >> 20)};
+    }
+    auto file = TemplateFile::read(path);
+    if (!file) {
+        return InputError{path, std::nullopt, Xlate("the template file cannot be read")};
+    }
+    if (file->text().isEmpty()) {
+        return InputError{path, TextPlace(), Xlate("the template file is empty: a <ReportTemplate> element was expected")};
+    }
+    return std::move(*file);
+}
+
+InputError whyNotLoaded(const QString &path, const TemplateFile &file, const QString &name)
+{
+    for (const TemplateRemark &remark : checkTemplates(file)) {
+        if (remark.isError) {
+            return {path, remark.place,
+                    Xlate("the template \"%1\" cannot be loaded: %2").arg(name, remark.text)};
+        }
+    }
+    return {path, TextPlace(),
+            Xlate("there is no template named \"%1\": one of %2 was expected")
+                .arg(name, templateNames(file).join(QStringLiteral(", ")))};
+}
+
+} // namespace kareport

@@ -1,0 +1,244 @@
+#include "ValueParser.h"
+
+#include "VariableType.h"
+#include "Xlate.h"
+
+#include <QUtf8StringView>
+
+#include <algorithm>
+#include <charconv>
+#include <cmath>
+#include <cstdlib>
+#include <limits>
+#include <string>
+
+namespace kareport
+{
+
+namespace
+{
+
+std::string_view trimmed(std::string_view text)
+{
+    const auto isBlank = [](char character) { return character == ' ' || character == '\t'; };
+    while (!text.empty() && isBlank(text.front())) {
+        text.remove_prefix(1);
+    }
+    while (!text.empty() && isBlank(text.back())) {
+        text.remove_suffix(1);
+    }
+    return text;
+}
+
+bool isDigit(char character)
+{
+    return character >= '0' && character <= '9';
+}
+
+/// A number too small for a double is 0 or nearly so; one too large is no number.
+bool parseOutOfRange(std::string_view text, double &number)
+{
+    number = std::strtod(std::string(text).c_str(), nullptr);
+    return std::isfinite(number);
+}
+
+bool parseWhole(std::string_view text, qint32 &number)
+{
+    text = trimmed(text);
+    if (text.size() > 1 && text.front() == '+' && isDigit(text[1])) {
+        text.remove_prefix(1);
+    }
+    const auto result = std::from_chars(text.data(), text.data() + text.size(), number);
+    return result.ec == std::errc() && result.ptr == text.data() + text.size();
+}
+
+bool equalsIgnoringCase(std::string_view text, std::string_view lower)
+{
+    return std::equal(text.begin(), text.end(), lower.begin(), lower.end(), [](char left, char right) {
+        return (left >= 'A' && left <= 'Z' ? static_cast<char>(left + ('a' - 'A')) : left) == right;
+    });
+}
+
+bool parseBoolean(std::string_view text, bool &value)
+{
+    text = trimmed(text);
+    for (const auto *yes : {"true", "yes", "y", "t", "1", "*"}) {
+        if (equalsIgnoringCase(text, yes)) {
+            value = true;
+            return true;
+        }
+    }
+    for (const auto *no : {"false", "no", "n", "f", "0"}) {
+        if (equalsIgnoringCase(text, no)) {
+            value = false;
+            return true;
+        }
+    }
+    return false;
+}
+
+/// The plus of a station such as 12+345.678 goes; one in front is a sign.
+bool parseStation(std::string_view text, double &number)
+{
+    text = trimmed(text);
+    const std::size_t plus = text.find('+', 1);
+    const bool grouped = plus != std::string_view::npos && isDigit(text[plus - 1]) && plus + 1 < text.size() &&
+                         isDigit(text[plus + 1]) && text.find_first_of("eE") == std::string_view::npos;
+    if (!grouped) {
+        return parseNumber(text, number);
+    }
+    std::string joined(text.substr(0, plus));
+    joined += text.substr(plus + 1);
+    return parseNumber(joined, number);
+}
+
+void assignUtf8(QString &target, std::string_view text)
+{
+    const bool ascii =
+        std::all_of(text.begin(), text.end(), [](char character) { return static_cast<signed char>(character) >= 0; });
+    if (!ascii) {
+        target = QString::fromUtf8(text.data(), static_cast<qsizetype>(text.size()));
+        return;
+    }
+    // The text's memory is kept from row to row.
+    target.resize(static_cast<qsizetype>(text.size()));
+    std::transform(text.begin(), text.end(), target.data(), [](char character) { return QLatin1Char(character); });
+}
+
+} // namespace
+
+bool parseNumber(std::string_view text, double &number)
+{
+    text = trimmed(text);
+    if (text.size() > 1 && text.front() == '+' && text[1] != '-' && text[1] != '+') {
+        text.remove_prefix(1);
+    }
+    const auto result = std::from_chars(text.data(), text.data() + text.size(), number);
+    if (result.ptr != text.data() + text.size() || text.empty() || text.back() == ')') {
+        return false;
+    }
+    return result.ec == std::errc() || (result.ec == std::errc::result_out_of_range && parseOutOfRange(text, number));
+}
+
+bool parseSexagesimal(std::string_view text, double &degrees)
+{
+    text = trimmed(text);
+    const bool negative = !text.empty() && text.front() == '-';
+    if (!text.empty() && (negative || text.front() == '+')) {
+        text.remove_prefix(1);
+    }
+    constexpr std::string_view marks[] = {"°", "'", "\""};
+    constexpr double partsPerDegree[] = {1, 60, 3600};
+    degrees = 0;
+    for (std::size_t part = 0; part < 3; ++part) {
+        const std::size_t end = std::min(text.find_first_not_of("0123456789."), text.size());
+        double value = 0;
+        const bool isLast = end == text.size() || text.substr(end) == marks[part];
+        if (end == 0 || !parseNumber(text.substr(0, end), value) || (part > 0 && value >= 60) ||
+            (!isLast && value != std::floor(value))) {
+            return false;
+        }
+        degrees += value / partsPerDegree[part];
+        text.remove_prefix(end);
+        if (text.empty() || text == marks[part]) {
+            degrees = negative ? -degrees : degrees;
+            return true;
+        }
+        if (text.starts_with(marks[part])) {
+            text.remove_prefix(marks[part].size());
+        } else if (text.front() == '-') {
+            text.remove_prefix(1);
+        } else {
+            return false;
+        }
+    }
+    return false;
+}
+
+ValueParser::ValueParser(int type, unsigned id, const DataUnits &units)
+    : form_(Form::Number), id_(id), factor_(units.factorOf(type))
+{
+    switch (type) {
+    case VARIABLE_INTEGER: form_ = Form::Whole; break;
+    case VARIABLE_TEXT:
+    case VARIABLE_NAME: form_ = Form::Text; break;
+    case VARIABLE_NUMBER: form_ = Form::PointNumber; break;
+    case VARIABLE_BOOLEAN:
+    case VARIABLE_FLAG: form_ = Form::Boolean; break;
+    case VARIABLE_STATION: form_ = Form::Station; break;
+    case VARIABLE_ANGLE:
+    case VARIABLE_VANGLE:
+    case VARIABLE_BEARING: form_ = units.sexagesimal ? Form::Angle : Form::Number; break;
+    default: break;
+    }
+}
+
+bool ValueParser::store(std::string_view text, UDictionary &object) const
+{
+    const bool isText = form_ == Form::Text || form_ == Form::PointNumber;
+    if (text.empty() || (!isText && trimmed(text).empty())) {
+        object.Remove(id_);
+        return true;
+    }
+    double number = 0;
+    bool fits = false;
+    switch (form_) {
+    case Form::Whole: {
+        qint32 whole = 0;
+        fits = parseWhole(text, whole);
+        object.Refill<qint32>(id_) = whole;
+        return fits;
+    }
+    case Form::Text: assignUtf8(object.Refill<QString>(id_), text); return true;
+    case Form::PointNumber: assignUtf8(object.Refill<UPointNumber>(id_).text(), text); return true;
+    case Form::Boolean: {
+        bool value = false;
+        fits = parseBoolean(text, value);
+        object.Refill<bool>(id_) = value;
+        return fits;
+    }
+    case Form::Number: fits = parseNumber(text, number); break;
+    case Form::Station: fits = parseStation(text, number); break;
+    case Form::Angle: fits = parseSexagesimal(text, number); break;
+    }
+    object.Refill<double>(id_) = number * factor_;
+    return fits;
+}
+
+bool ValueParser::storeNumber(double number, UDictionary &object) const
+{
+    switch (form_) {
+    case Form::Whole: {
+        const bool fits = number == std::floor(number) && number >= std::numeric_limits<qint32>::min() &&
+                          number <= std::numeric_limits<qint32>::max();
+        object.Refill<qint32>(id_) = fits ? static_cast<qint32>(number) : 0;
+        return fits;
+    }
+    case Form::Text: object.Refill<QString>(id_) = QString::number(number, 'g', 15); return true;
+    case Form::PointNumber: object.Refill<UPointNumber>(id_).text() = QString::number(number, 'g', 15); return true;
+    case Form::Boolean: object.Refill<bool>(id_) = number != 0; return number == 0 || number == 1;
+    default: object.Refill<double>(id_) = number * factor_; return true;
+    }
+}
+
+bool ValueParser::storeBoolean(bool value, UDictionary &object) const
+{
+    object.Refill<bool>(id_) = value;
+    return form_ == Form::Boolean;
+}
+
+QString ValueParser::expected() const
+{
+    switch (form_) {
+    case Form::Whole: return Xlate("a whole number");
+    case Form::Text:
+    case Form::PointNumber: return Xlate("a text");
+    case Form::Boolean: return Xlate("yes or no");
+    case Form::Station: return Xlate("a station such as 12+345.678");
+    case Form::Angle: return Xlate("an angle such as 45-30-15");
+    case Form::Number: break;
+    }
+    return Xlate("a number");
+}
+
+} // namespace kareport

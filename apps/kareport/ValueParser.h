@@ -1,0 +1,54 @@
+#pragma once
+
+#include "DataUnits.h"
+#include "UDictionary.h"
+
+#include <QString>
+
+#include <string_view>
+
+namespace kareport
+{
+
+/// Reads values of one variable out of texts.
+class ValueParser
+{
+public:
+    /// @param type  a value type code, @param id  where the values are stored
+    ValueParser(int type, unsigned id, const DataUnits &units);
+
+    unsigned id() const { return id_; }
+
+    /// Stores the value of a UTF-8 text; an empty text stores none.
+    /// @return whether the text fits the type
+    bool store(std::string_view text, UDictionary &object) const;
+    /// Stores a number that is one already. @return whether it fits the type
+    bool storeNumber(double number, UDictionary &object) const;
+    bool storeBoolean(bool value, UDictionary &object) const;
+
+    /// What a text of the type looks like, for a message that says what was expected.
+    QString expected() const;
+
+private:
+    enum class Form
+    {
+        Whole,
+        Text,
+        PointNumber,
+        Boolean,
+        Number,
+        Station,
+        Angle ///< in degrees, minutes and seconds
+    };
+
+    Form form_;
+    unsigned id_;
+    double factor_;
+};
+
+/// A number as data files write it, INF and NAN among them; blanks around it and one sign are allowed.
+bool parseNumber(std::string_view text, double &number);
+/// An angle such as -45-30-15.5 or 45°30'15", in degrees. Minutes and seconds may be missing.
+bool parseSexagesimal(std::string_view text, double &degrees);
+
+} // namespace kareport

@@ -1,0 +1,18 @@
+#pragma once
+
+#include "KaReportExport.h"
+#include "TemplateFile.h"
+#include "sXmlReportTemplateInfo.h"
+
+#include <QStringList>
+
+#include <vector>
+
+namespace kareport
+{
+
+/// All templates of a file, in file order, without one being chosen.
+KAREPORT_EXPORT std::vector<sXmlReportTemplateInfo> templateInfos(const TemplateFile &file);
+KAREPORT_EXPORT QStringList templateNames(const TemplateFile &file);
+
+} // namespace kareport
