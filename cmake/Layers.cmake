@@ -7,6 +7,11 @@ target_compile_definitions(ka_options INTERFACE
 target_compile_options(ka_options INTERFACE
     -Wall -Wextra -Wpedantic -Wshadow -Wconversion -Wsign-conversion -Wold-style-cast -Wnon-virtual-dtor
     -Woverloaded-virtual -Wundef -Wcast-align)
+# The libraries' own functions call each other directly, also where they are offered outside.
+target_compile_options(ka_options INTERFACE -fno-semantic-interposition)
+if(KAREPORT_LTO)
+    set(CMAKE_INTERPROCEDURAL_OPTIMIZATION ON)
+endif()
 if(KAREPORT_WERROR)
     target_compile_options(ka_options INTERFACE -Werror)
 endif()

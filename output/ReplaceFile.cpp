@@ -29,14 +29,16 @@ bool replaceFile(const QString &path, const std::function<bool(QIODevice &)> &wr
 bool writeReportText(QIODevice &device, QStringView text, LineEnds lineEnds)
 {
     if (lineEnds == LineEnds::ReportFile &&
-        device.write(reportFileMark, sizeof reportFileMark) != qint64(sizeof reportFileMark)) {
+        device.write(reportFileMark, sizeof reportFileMark) != qint64(sizeof reportFileMark))
+    {
         return false;
     }
     ReportTextEncoder encoder(lineEnds);
     std::vector<char> bytes(ReportTextEncoder::bound(pieceSize));
     for (qsizetype at = 0; at < text.size(); at += pieceSize) {
         const qsizetype count = std::min(pieceSize, text.size() - at);
-        const auto size = static_cast<qint64>(encoder.encode(text.sliced(at, count), bytes.data(), at + count == text.size()));
+        const auto size =
+            static_cast<qint64>(encoder.encode(text.sliced(at, count), bytes.data(), at + count == text.size()));
         if (device.write(bytes.data(), size) != size) {
             return false;
         }

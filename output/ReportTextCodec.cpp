@@ -81,7 +81,8 @@ std::size_t ReportTextEncoder::encode(QStringView text, char *out, bool last)
     while (at != end) {
         while (static_cast<std::size_t>(end - at) >= runLength &&
                (reportFile ? isPlainRun(at, [](char16_t c) { return c == u'\n'; })
-                           : isPlainRun(at, [](char16_t c) { return c == u'\r'; }))) {
+                           : isPlainRun(at, [](char16_t c) { return c == u'\r'; })))
+        {
             for (std::size_t i = 0; i < runLength; ++i) {
                 out[i] = static_cast<char>(at[i]);
             }

@@ -19,6 +19,7 @@ namespace
 {
 
 constexpr int hundredthsPerInch = 2540; // of a millimetre
+constexpr qreal millimetresPerInch = 25.4;
 constexpr int pointsPerInch = 72;
 constexpr qsizetype longestFaceName = 31;
 
@@ -37,7 +38,9 @@ QPageSize::PageSizeId sheetOf(PaperSize paper)
 PageDevice builtInDevice(bool portrait)
 {
     const DefaultPrinter &printer = defaultPrinter();
-    const QSize upright = QPageSize(sheetOf(printer.paper)).sizePixels(printer.resolution);
+    // Not QPageSize::sizePixels: it counts in whole points, which is several dots off at a printer's resolution.
+    const QSizeF millimetres = QPageSize(sheetOf(printer.paper)).size(QPageSize::Millimeter);
+    const QSize upright = (millimetres * printer.resolution / millimetresPerInch).toSize();
     return {portrait ? upright : upright.transposed(), printer.resolution};
 }
 
@@ -63,8 +66,8 @@ PageGeometry measurePage(const PageDevice &device, const QMargins &margins, cons
     PageGeometry geometry;
     geometry.pageSize = device.size;
     geometry.resolution = static_cast<unsigned>(device.resolution);
-    geometry.linesPerPage = (device.size.height() - dots(margins.bottom()) - dots(margins.top())) /
-                            (font.height + font.externalLeading);
+    geometry.linesPerPage =
+        (device.size.height() - dots(margins.bottom()) - dots(margins.top())) / (font.height + font.externalLeading);
     geometry.charsPerRow = (device.size.width() - dots(margins.right()) - dots(margins.left())) / font.averageWidth;
     return geometry;
 }

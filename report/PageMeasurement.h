@@ -29,7 +29,7 @@ struct FontExtents
 /// Printed page of a report, measured once from a printer and a font.
 struct PageGeometry
 {
-    QSize pageSize;          ///< whole sheet, printer dots; (0, 0) until measured
+    QSize pageSize = {0, 0}; ///< whole sheet, printer dots; (0, 0) until measured
     unsigned resolution = 0; ///< vertical dots per inch; 0 until measured
     int linesPerPage = 72;   ///< lines between the margins
     int charsPerRow = 80;    ///< characters of average width between the margins

@@ -19,8 +19,7 @@ PageWriterObserver::~PageWriterObserver() = default;
 
 PageWriter::PageWriter(PageWriterObserver *observer, ReportText::Reallocate reallocate)
     : observer_(observer), text_(reallocate)
-{
-}
+{}
 
 void PageWriter::clear()
 {

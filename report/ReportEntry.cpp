@@ -20,9 +20,7 @@ const QString creatorName = QStringLiteral("REPORTDOCTEMPLATE");
 kareport::ReportWindow::~ReportWindow() = default;
 kareport::ReportViewPort::~ReportViewPort() = default;
 
-void LoadKaReport()
-{
-}
+void LoadKaReport() {}
 
 std::unique_ptr<UDocTemplate> ReportInitialTemplate(UDocTemplate::PaneFactory makePane,
                                                     UDocTemplate::ViewFactory makeView)
@@ -53,8 +51,8 @@ UReportDoc *CreateReport(const QString &name, bool headerFlag, bool externalEdit
     if (reportTemplate == nullptr) {
         return nullptr;
     }
-    auto *report = static_cast<UReportDoc *>(
-        reportTemplate->OpenReportDocumentFile(QString(), show, show, pane, style, rect));
+    auto *report =
+        static_cast<UReportDoc *>(reportTemplate->OpenReportDocumentFile(QString(), show, show, pane, style, rect));
     if (report == nullptr) {
         return nullptr;
     }

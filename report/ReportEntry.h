@@ -16,8 +16,8 @@ KAREPORT_EXPORT void LoadKaReport();
 
 /// A new document template for reports, which the host adds to its application. With no pane and view given, reports are
 /// made without windows.
-KAREPORT_EXPORT std::unique_ptr<UDocTemplate>
-ReportInitialTemplate(UDocTemplate::PaneFactory makePane = {}, UDocTemplate::ViewFactory makeView = {});
+KAREPORT_EXPORT std::unique_ptr<UDocTemplate> ReportInitialTemplate(UDocTemplate::PaneFactory makePane = {},
+                                                                    UDocTemplate::ViewFactory makeView = {});
 
 /// The application's document template for reports; null when there is no application or no such template.
 KAREPORT_EXPORT UDocTemplate *GetReportTemplate();

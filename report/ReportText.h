@@ -19,8 +19,8 @@ public:
     /// What memory is got with: `realloc`, or a test's own.
     using Reallocate = void *(*)(void *memory, std::size_t bytes);
 
-    static constexpr qint64 blockSize = 32000;     ///< characters in a block
-    static constexpr qint64 longest = 0x7FFFFFFF;  ///< characters in a text at most
+    static constexpr qint64 blockSize = 32000;    ///< characters in a block
+    static constexpr qint64 longest = 0x7FFFFFFF; ///< characters in a text at most
 
     /// One block, empty. @throws std::bad_alloc when there is no memory for it
     explicit ReportText(Reallocate reallocate = nullptr);

@@ -22,9 +22,7 @@ const QString printHashEntry = QStringLiteral("ReportPrintHash");
 QHash<const UReportDoc *, bool> UReportDoc::UReportMgr;
 bool UReportDoc::printHash_ = false;
 
-UReportDoc::UReportDoc() : UReportDoc(QString(), false, false, nullptr)
-{
-}
+UReportDoc::UReportDoc() : UReportDoc(QString(), false, false, nullptr) {}
 
 UReportDoc::UReportDoc(const QString &name, bool externalEditor, bool closeDocument, UDocument *owner)
     : owner_(owner), page_(this), externalEditor_(externalEditor), closeDocument_(closeDocument)
@@ -113,6 +111,7 @@ void UReportDoc::WriteHeader()
 
 void UReportDoc::textWritten(QStringView text, int /*style*/)
 {
+    SetModifiedFlag(true);
     if (reportWindow_ != nullptr) {
         reportWindow_->WriteLine(text.toString());
     }
@@ -120,6 +119,7 @@ void UReportDoc::textWritten(QStringView text, int /*style*/)
 
 void UReportDoc::lineEnded()
 {
+    SetModifiedFlag(true);
 }
 
 void UReportDoc::changed()
@@ -139,8 +139,8 @@ int UReportDoc::SetPageSize()
     geometry_.pageSize = device->size;
     geometry_.resolution = static_cast<unsigned>(device->resolution);
     if (!fixedLinesPerPage_ || !fixedCharsPerRow_) {
-        geometry_ = kareport::measurePage(*device, margins_,
-                                          kareport::measureFont(fontName_, fontSize_, device->resolution));
+        geometry_ =
+            kareport::measurePage(*device, margins_, kareport::measureFont(fontName_, fontSize_, device->resolution));
     }
     FixPage(fixedLinesPerPage_, fixedCharsPerRow_);
     return 1;

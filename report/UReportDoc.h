@@ -83,14 +83,14 @@ public:
 
     /// Measures the page on the default printer. @return 1, or 0 without a printer: the figures then stay as they were
     int SetPageSize();
-    /// Fixes the lines of a page or the characters of a row, whatever the printer says; with both, no printer is asked.
+    /// Fixes the lines of a page or the characters of a row, whatever is measured; with both, no font is measured.
     /// Figures are 1 or more.
     void FixPage(std::optional<int> linesPerPage, std::optional<int> charsPerRow);
     int GetLinesPerPage() const { return page_.linesPerPage(); }
     int GetCharsPerRow() const { return geometry_.charsPerRow; }
-    int GetLineCount() const { return page_.lineCount(); }   ///< 0: nothing has been written yet
-    int GetLineNumber() const { return page_.lineNumber(); } ///< on the page, from 1
-    int GetPageNumber() const { return page_.pageNumber(); } ///< from 1
+    int GetLineCount() const { return page_.lineCount(); }               ///< 0: nothing has been written yet
+    int GetLineNumber() const { return page_.lineNumber(); }             ///< on the page, from 1
+    int GetPageNumber() const { return page_.pageNumber(); }             ///< from 1
     unsigned GetPrintResolution() const { return geometry_.resolution; } ///< vertical dots per inch; 0: not measured
     QSize GetPageSize() const { return geometry_.pageSize; }             ///< whole sheet in printer dots
     unsigned GetFontSize() const { return fontSize_; }                   ///< points

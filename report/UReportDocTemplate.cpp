@@ -29,12 +29,14 @@ bool UReportDoc::LoadTemplateXml(const QString &fileName, const QString &templat
     block_.reset();
     template_ = std::make_unique<UXmlReportTpl>();
     if (!template_->LoadTemplate(fileIn(GetLibraryDir(false), fileName), templateName) &&
-        !template_->LoadTemplate(fileIn(GetStartPathName(), fileName), templateName)) {
+        !template_->LoadTemplate(fileIn(GetStartPathName(), fileName), templateName))
+    {
         return false;
     }
     pageBreaks_ = template_->GetPageBreakXmlOption();
     // The option is a signed 8-bit character and is widened with its sign.
-    separator_ = static_cast<char16_t>(static_cast<qint16>(static_cast<signed char>(template_->GetSeparatorXmlOption())));
+    separator_ =
+        static_cast<char16_t>(static_cast<qint16>(static_cast<signed char>(template_->GetSeparatorXmlOption())));
     if (!tableName.isEmpty() && !LoadTemplateTable(tableName)) {
         return false;
     }
@@ -85,7 +87,7 @@ QString UReportDoc::FormatXmlStringToDisplay(const sXmlReportField *field, int k
 
 bool UReportDoc::WriteDataBlock(const UDataObject *object, int linesBefore, int linesAfter)
 try {
-    if (!template_ || !block_ || object == nullptr) {
+    if (!block_ || !block_->IsLoaded() || object == nullptr) {
         return false;
     }
     const kareport::FormatOptions options = formatOptions();
@@ -102,7 +104,7 @@ bool UReportDoc::WriteDataBlock(const QString &blockName, const UDataObject *obj
 
 bool UReportDoc::WriteDataTable(UDataObjectList *list, int linesBefore, int linesAfter, int headingLinesAfter)
 try {
-    if (!template_ || !table_ || list == nullptr) {
+    if (!table_ || !table_->IsLoaded() || list == nullptr) {
         return false;
     }
     const kareport::FormatOptions options = formatOptions();

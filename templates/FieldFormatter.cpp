@@ -53,9 +53,11 @@ FieldFormatter::FieldFormatter(const sXmlReportField &field)
       align_(equalFolded(field.Align, u"C")   ? Align::Centre
              : equalFolded(field.Align, u"L") ? Align::Left
                                               : Align::Right),
-      width_(field.Width), decimals_(field.Decimals), type_(field.Type), id_(static_cast<quint32>(field.ID))
-{
-}
+      width_(field.Width),
+      decimals_(field.Decimals),
+      type_(field.Type),
+      id_(static_cast<quint32>(field.ID))
+{}
 
 void FieldFormatter::append(TextBuffer &out, const FormatOptions &options, int kind, const void *value,
                             QStringView suffix) const

@@ -5,9 +5,7 @@
 namespace kareport
 {
 
-ScanText::ScanText(QString text) : text_(std::move(text)), runs_{{0, 0}}
-{
-}
+ScanText::ScanText(QString text) : text_(std::move(text)), runs_{{0, 0}} {}
 
 void ScanText::append(QStringView characters, qsizetype source)
 {

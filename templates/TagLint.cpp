@@ -12,11 +12,10 @@ namespace
 {
 
 constexpr std::array<QStringView, 25> elementNames = {
-    u"ReportTemplate", u"Name",         u"Title",    u"Tables",       u"Table",     u"Use",
-    u"Sort",           u"OutputList",   u"Field",    u"VariableName", u"Label",     u"Format",
-    u"Align",          u"Dictionaries", u"Variable", u"Dictionary",   u"ID",        u"DictionaryName",
-    u"VariableList",   u"Type",         u"Blocks",   u"Block",        u"Separator", u"PageBreaks",
-    u"Options"};
+    u"ReportTemplate", u"Name",       u"Title",        u"Tables",         u"Table",        u"Use",   u"Sort",
+    u"OutputList",     u"Field",      u"VariableName", u"Label",          u"Format",       u"Align", u"Dictionaries",
+    u"Variable",       u"Dictionary", u"ID",           u"DictionaryName", u"VariableList", u"Type",  u"Blocks",
+    u"Block",          u"Separator",  u"PageBreaks",   u"Options"};
 
 /// Longer than any tag that somebody means as one, attributes included.
 constexpr qsizetype longestTag = 200;
@@ -84,7 +83,8 @@ std::vector<TagRemark> findIgnoredTags(const ScanText &file)
         if (isTag == inComment) {
             QString quote = u'<' + tag.first(std::min(tag.size(), longestQuote)).toString();
             quote += tag.size() > longestQuote ? QStringLiteral("…>") : QStringLiteral(">");
-            remarks.push_back({isTag ? TagRemark::Kind::InComment : TagRemark::Kind::NotATag, file.sourceOf(at), quote});
+            remarks.push_back(
+                {isTag ? TagRemark::Kind::InComment : TagRemark::Kind::NotATag, file.sourceOf(at), quote});
         }
     }
     return remarks;

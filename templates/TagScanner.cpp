@@ -79,15 +79,21 @@ ScanElement elementBetween(const ScanText &text, QStringView tag, qsizetype open
     if (inner >= 0) {
         note(notes, ScanNote::Kind::RunsOn, tag, element.value.sourceOf(inner));
     }
-    const QStringView view = text.view();
-    if (shortClosing.standsAt(view, close)) {
-        const qsizetype behind = close + shortClosing.size();
-        const QStringView dropped = view.sliced(behind).first(std::min(tag.size(), view.size() - behind));
-        if (!dropped.trimmed().isEmpty()) {
-            note(notes, ScanNote::Kind::ShortCloseDrops, tag, text.sourceOf(behind), dropped.toString());
-        }
-    }
     return element;
+}
+
+/// What goes with a short closing tag when its element is cut out.
+void noteDropped(const ScanText &text, QStringView tag, qsizetype close, ScanNotes *notes)
+{
+    const QStringView view = text.view();
+    if (notes == nullptr || !shortClosing.standsAt(view, close)) {
+        return;
+    }
+    const qsizetype behind = close + shortClosing.size();
+    const QStringView dropped = view.sliced(behind).first(std::min(tag.size(), view.size() - behind));
+    if (!dropped.trimmed().isEmpty()) {
+        note(notes, ScanNote::Kind::ShortCloseDrops, tag, text.sourceOf(behind), dropped.toString());
+    }
 }
 
 struct Extent
@@ -125,6 +131,7 @@ ScanElement ExtractNode(ScanText &text, QStringView tag, bool remove, ScanNotes 
     }
     ScanElement element = elementBetween(text, tag, found->open, found->value, found->close, notes);
     if (remove) {
+        noteDropped(text, tag, found->close, notes);
         const qsizetype behind = std::min(found->close + closing(tag).size(), text.size());
         text.remove(found->open, behind - found->open);
     }
@@ -163,8 +170,8 @@ std::optional<ScanElement> NodeSequence::next()
     if (close == open->value) {
         return end(ScanNote::Kind::EmptyEndsList, open->at);
     }
-    ScanElement element =
-        elementBetween(text_, tag_, std::max(open->at, position_), open->value, close, notes_);
+    ScanElement element = elementBetween(text_, tag_, std::max(open->at, position_), open->value, close, notes_);
+    noteDropped(text_, tag_, close, notes_);
     if (open->at < position_) {
         kept_.chop(position_ - open->at);
     } else {

@@ -22,9 +22,9 @@ struct ScanNote
         ShortCloseDrops   ///< what follows a short closing tag is dropped with it
     };
     Kind kind;
-    QStringView tag;       ///< the element's name as the scanner was given it
-    qsizetype source;      ///< where in the file
-    QString text;          ///< the dropped characters
+    QStringView tag;  ///< the element's name as the scanner was given it
+    qsizetype source; ///< where in the file
+    QString text;     ///< the dropped characters
 };
 using ScanNotes = std::vector<ScanNote>;
 

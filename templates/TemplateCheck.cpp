@@ -95,8 +95,9 @@ void Checker::checkNames(const std::vector<TemplateElement> &templates)
         }
         const QString key = foldedKey(element.name.value.view());
         if (names.contains(key)) {
-            warning(element.name.source,
-                    Xlate("a template named %1 stands before: the last one of a name is read").arg(quoted(element.name)));
+            warning(
+                element.name.source,
+                Xlate("a template named %1 stands before: the last one of a name is read").arg(quoted(element.name)));
         }
         names.insert(key);
     }
@@ -133,7 +134,8 @@ void Checker::checkTemplate(const TemplateElement &element)
         const auto known = variables_.constFind(foldedKey(sort.use.value.view()));
         for (const ScanElement &name : sort.variableNames) {
             if (known != variables_.constEnd() && !known->contains(foldedKey(name.value.view()))) {
-                error(name.source, Xlate("the sort key %1 is not in the dictionary %2").arg(quoted(name), quoted(sort.use)));
+                error(name.source,
+                      Xlate("the sort key %1 is not in the dictionary %2").arg(quoted(name), quoted(sort.use)));
             }
         }
     }
@@ -163,18 +165,21 @@ void Checker::checkVariables(const DictionaryElement &dictionary)
     for (const VariableElement &variable : dictionary.variables) {
         if (!variableTypeFromKeyword(variable.type.value.view())) {
             error(variable.type.exists() ? variable.type.source : variable.element.source,
-                  Xlate("unknown type %1: the variable %2 is left out").arg(quoted(variable.type), quoted(variable.variableName)));
+                  Xlate("unknown type %1: the variable %2 is left out")
+                      .arg(quoted(variable.type), quoted(variable.variableName)));
             continue;
         }
         const qint32 id = leadingInteger(variable.id.value.view());
         if (variable.id.value.text() != QString::number(id)) {
-            warning(variable.id.exists() ? variable.id.source : variable.element.source,
-                    Xlate("the identifier %1 counts as %2: a whole number was expected").arg(quoted(variable.id)).arg(id));
+            warning(
+                variable.id.exists() ? variable.id.source : variable.element.source,
+                Xlate("the identifier %1 counts as %2: a whole number was expected").arg(quoted(variable.id)).arg(id));
         }
         const QString key = foldedKey(variable.variableName.value.view());
         if (known.contains(key)) {
             warning(variable.variableName.source,
-                    Xlate("the variable %1 stands twice in the dictionary: the last one counts").arg(quoted(variable.variableName)));
+                    Xlate("the variable %1 stands twice in the dictionary: the last one counts")
+                        .arg(quoted(variable.variableName)));
         } else if (ids.contains(id)) {
             warning(variable.element.source, Xlate("the variables \"%1\" and %2 share the identifier %3")
                                                  .arg(ids.value(id), quoted(variable.variableName))
@@ -193,7 +198,8 @@ void Checker::checkOutput(const OutputElement &output, bool isTable)
     const bool hasDictionary = variables_.contains(foldedKey(output.use.value.view())) && !output.use.value.isEmpty();
     if (!hasDictionary) {
         const qsizetype source = output.use.exists() ? output.use.source : output.element.source;
-        error(source, Xlate("there is no dictionary named %1: %2 cannot be written").arg(quoted(output.use), quoted(output.name)));
+        error(source, Xlate("there is no dictionary named %1: %2 cannot be written")
+                          .arg(quoted(output.use), quoted(output.name)));
     }
     if (output.fields.empty()) {
         warning(output.element.source, Xlate("%1 has no fields").arg(quoted(output.name)));
@@ -209,9 +215,12 @@ void Checker::checkField(const FieldElement &field, const QString &use, bool isT
     const ScanElement &name = field.variableName;
     const qsizetype source = name.exists() ? name.source : field.element.source;
     const FieldMarker marker = fieldMarker(name.value.view());
-    if (marker == FieldMarker::None && !use.isEmpty() && !variables_.value(use).contains(foldedKey(name.value.view()))) {
-        error(source, isTable ? Xlate("the dictionary has no variable %1: the column cannot be filled").arg(quoted(name))
-                              : Xlate("the dictionary has no variable %1: the line repeats the value before it").arg(quoted(name)));
+    if (marker == FieldMarker::None && !use.isEmpty() && !variables_.value(use).contains(foldedKey(name.value.view())))
+    {
+        error(source,
+              isTable
+                  ? Xlate("the dictionary has no variable %1: the column cannot be filled").arg(quoted(name))
+                  : Xlate("the dictionary has no variable %1: the line repeats the value before it").arg(quoted(name)));
     }
     const FieldFormat format = parseFieldFormat(field.format.value.view());
     const qsizetype formatSource = field.format.exists() ? field.format.source : field.element.source;
@@ -226,7 +235,8 @@ void Checker::checkField(const FieldElement &field, const QString &use, bool isT
     }
     const QStringView align = field.align.value.view();
     if (!align.isEmpty() && !equalFolded(align, u"LEFT") && !equalFolded(align, u"RIGHT") &&
-        !(isTable && equalFolded(align, u"CENTER"))) {
+        !(isTable && equalFolded(align, u"CENTER")))
+    {
         warning(field.align.source, Xlate("the alignment %1 counts as LEFT").arg(quoted(field.align)));
     }
     checkText(field.label);
@@ -257,7 +267,8 @@ void Checker::addNotes()
             error(note.source, Xlate("%1 is not read: its closing tag was expected").arg(tag));
             break;
         case ScanNote::Kind::RunsOn:
-            error(note.source, Xlate("%1 stands in another %1: the outer one is cut short at the first closing tag").arg(tag));
+            error(note.source,
+                  Xlate("%1 stands in another %1: the outer one is cut short at the first closing tag").arg(tag));
             break;
         case ScanNote::Kind::ShortCloseDrops:
             warning(note.source, Xlate("\"%1\" is dropped with the short closing tag of %2").arg(note.text, tag));

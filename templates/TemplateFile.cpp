@@ -36,8 +36,8 @@ bool isStripped(QChar character)
 TemplateFile::TemplateFile(QByteArrayView bytes)
 {
     const bool utf8 = QUtf8StringView(bytes.data(), bytes.size()).isValidUtf8();
-    const QByteArray kept = bytes.contains('\0') ? withoutZeroTails(bytes)
-                                                 : QByteArray::fromRawData(bytes.data(), bytes.size());
+    const QByteArray kept =
+        bytes.contains('\0') ? withoutZeroTails(bytes) : QByteArray::fromRawData(bytes.data(), bytes.size());
     text_ = utf8 ? QString::fromUtf8(kept) : QString::fromLatin1(kept);
 }
 

@@ -25,6 +25,7 @@ public:
     const QString &text() const { return text_; }
     /// The text that is scanned: without tabs, line feeds and carriage returns, which also values lose.
     ScanText scanText() const;
+
 private:
     QString text_;
 };

@@ -1,7 +1,5 @@
 #include "TemplateText.h"
 
-#include <QList>
-
 #include <algorithm>
 #include <limits>
 
@@ -18,8 +16,14 @@ QString foldedKey(QStringView text)
     // A full folding would make two characters of one; each character is folded by itself.
     QString key;
     key.reserve(text.size());
-    for (const char32_t character : text.toUcs4()) {
-        key.append(QStringView(QChar::fromUcs4(QChar::toCaseFolded(character))));
+    for (qsizetype i = 0; i < text.size(); ++i) {
+        if (text[i].isHighSurrogate() && i + 1 < text.size() && text[i + 1].isLowSurrogate()) {
+            const char32_t character = QChar::surrogateToUcs4(text[i], text[i + 1]);
+            key.append(QStringView(QChar::fromUcs4(QChar::toCaseFolded(character))));
+            ++i;
+        } else {
+            key.append(text[i].toCaseFolded());
+        }
     }
     return key;
 }

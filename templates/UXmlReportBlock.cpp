@@ -22,8 +22,7 @@ bool UXmlReportBlock::LoadBlock(const QString &blockName, const UXmlReportTpl *r
 
 sXmlReportField UXmlReportBlock::GetField(int index) const
 {
-    return index >= 0 && index < GetFieldsCount() ? block_->Fields[static_cast<std::size_t>(index)]
-                                                  : sXmlReportField();
+    return index >= 0 && index < GetFieldsCount() ? block_->Fields[static_cast<std::size_t>(index)] : sXmlReportField();
 }
 
 int UXmlReportBlock::GetFieldsCount() const

@@ -14,6 +14,9 @@ public:
     /// @return false, and points to nothing, for a null template, an unknown block or one whose dictionary is missing
     bool LoadBlock(const QString &blockName, const UXmlReportTpl *reportTemplate);
 
+    /// Whether the handle points to a block.
+    bool IsLoaded() const { return block_ != nullptr; }
+
     /// A copy of the field at an index from 0; outside, a field with empty texts and zeros.
     sXmlReportField GetField(int index) const;
     /// 0 when no block is loaded.

@@ -37,8 +37,7 @@ bool UXmlReportTable::LoadTable(const QString &tableName, const UXmlReportTpl *r
 
 sXmlReportField UXmlReportTable::GetField(int index) const
 {
-    return index >= 0 && index < GetFieldsCount() ? table_->Fields[static_cast<std::size_t>(index)]
-                                                  : sXmlReportField();
+    return index >= 0 && index < GetFieldsCount() ? table_->Fields[static_cast<std::size_t>(index)] : sXmlReportField();
 }
 
 int UXmlReportTable::GetFieldsCount() const

@@ -16,6 +16,9 @@ public:
     /// @return false, and points to nothing, for a null template, an unknown table or one whose dictionary is missing
     bool LoadTable(const QString &tableName, const UXmlReportTpl *reportTemplate);
 
+    /// Whether the handle points to a table.
+    bool IsLoaded() const { return table_ != nullptr; }
+
     /// A copy of the field at an index from 0; outside, a field with empty texts and zeros.
     sXmlReportField GetField(int index) const;
     /// 0 when no table is loaded.

@@ -4,7 +4,7 @@
 #include "TemplateText.h"
 #include "Xlate.h"
 
-#include <QHash>
+#include <QSet>
 
 #include <algorithm>
 #include <numeric>
@@ -15,14 +15,13 @@ namespace kareport
 namespace
 {
 
-/// Rows between two looks at the progress.
-constexpr std::size_t progressRows = 4096;
 constexpr std::size_t longestQuote = 40;
 
-/// A cell for a message, cut short at a whole character.
+/// A cell for a message, cut short.
 QString quoteOf(std::string_view cell)
 {
-    const QString text = QString::fromUtf8(cell.data(), static_cast<qsizetype>(std::min(cell.size(), 4 * longestQuote)));
+    const QString text =
+        QString::fromUtf8(cell.data(), static_cast<qsizetype>(std::min(cell.size(), 4 * longestQuote)));
     return text.size() > qsizetype(longestQuote) ? text.left(longestQuote) + u'…' : text;
 }
 
@@ -43,91 +42,112 @@ void CsvObjectList::readHeader(const FindVariable &findVariable)
                                  : reader_.errorAt(TextPlace(), Xlate("a header row of variable names was expected"));
         return;
     }
-    QHash<QString, bool> names;
+    QSet<QString> names;
     for (std::size_t i = 0; i < reader_.cells().size(); ++i) {
         const std::string_view cell = reader_.cells()[i];
         const QString name = QString::fromUtf8(cell.data(), static_cast<qsizetype>(cell.size()));
         if (names.contains(foldedKey(name))) {
-            error_ = reader_.errorAt(reader_.placeOfCell(i),
-                                     Xlate("the column \"%1\" stands twice: each variable was expected once").arg(name));
+            error_ =
+                reader_.errorAt(reader_.placeOfCell(i),
+                                Xlate("the column \"%1\" stands twice: each variable was expected once").arg(name));
             return;
         }
-        names.insert(foldedKey(name), true);
+        names.insert(foldedKey(name));
         columns_.push_back({name, findVariable(name)});
     }
 }
 
 UDataObject *CsvObjectList::GetAt(std::size_t index)
 {
-    if (error_ || stopped_) {
+    if (stopped_ || (error_ && batch_ == nullptr)) {
         return nullptr;
     }
-    if (order_) {
-        if (index >= order_->size()) {
-            return nullptr;
-        }
-        reader_.seek((*order_)[index].start, (*order_)[index].line);
-        nextIndex_ = index;
-    } else if (index < nextIndex_) {
-        rewind();
+    if (batch_ == nullptr || index < batchStart_) {
+        start();
     }
-    while (nextIndex_ <= index) {
-        if (!readRow()) {
+    while (index - batchStart_ >= batch_->count) {
+        if (!takeBatch()) {
             return nullptr;
         }
     }
-    return &row_;
+    return const_cast<UDataObject *>(&batch_->objects[index - batchStart_]);
 }
 
-void CsvObjectList::rewind()
+/// Begins to read at the first row.
+void CsvObjectList::start()
 {
+    static const RowBatch nothing;
+    batches_.reset();
     reader_.seek(firstRow_.start, firstRow_.line);
-    nextIndex_ = 0;
+    nextOrdered_ = 0;
+    error_.reset();
+    batch_ = &nothing;
+    batchStart_ = 0;
+    batches_ = std::make_unique<RowBatches>([this](RowBatch &batch) { fill(batch); });
 }
 
-bool CsvObjectList::readRow()
+/// Goes on to the next batch. @return false when there is none
+bool CsvObjectList::takeBatch()
 {
-    if (nextIndex_ % progressRows == 0 && !goOn()) {
+    if (batch_->isLast) {
+        error_ = batch_->error;
         return false;
     }
-    if (!reader_.next()) {
-        error_ = reader_.error();
-        return false;
-    }
-    ++nextIndex_;
-    return storeCells(row_, nullptr);
-}
-
-bool CsvObjectList::goOn()
-{
-    stopped_ = progress_ && !progress_(reader_.position());
+    batchStart_ += batch_->count;
+    batch_ = &batches_->next();
+    stopped_ = progress_ && !progress_(batch_->position);
     return !stopped_;
 }
 
-bool CsvObjectList::storeCells(UDataObject &object, const std::vector<unsigned> *onlyIds)
+void CsvObjectList::fill(RowBatch &batch)
+{
+    while (batch.count < RowBatch::most && !batch.isLast) {
+        batch.isLast = !readRow(batch);
+    }
+    batch.position = reader_.position();
+}
+
+bool CsvObjectList::readRow(RowBatch &batch)
+{
+    if (order_) {
+        if (nextOrdered_ == order_->size()) {
+            return false;
+        }
+        const RowPlace &place = (*order_)[nextOrdered_++];
+        reader_.seek(place.start, place.line);
+    }
+    if (!reader_.next()) {
+        batch.error = reader_.error();
+        return false;
+    }
+    batch.error = storeCells(batch.objects[batch.count], nullptr);
+    batch.count += batch.error ? 0U : 1U;
+    return !batch.error;
+}
+
+/// Stores the values of the row at hand. @return what is wrong with it
+std::optional<InputError> CsvObjectList::storeCells(UDataObject &object, const std::vector<unsigned> *onlyIds) const
 {
     const auto &cells = reader_.cells();
     if (cells.size() != columns_.size()) {
-        error_ = reader_.errorAt(reader_.placeOfCell(std::min(cells.size(), columns_.size())),
-                                 Xlate("the row has %1 cells: %2 were expected, as in the header row")
-                                     .arg(cells.size())
-                                     .arg(columns_.size()));
-        return false;
+        return reader_.errorAt(reader_.placeOfCell(std::min(cells.size(), columns_.size())),
+                               Xlate("the row has %1 cells: %2 were expected, as in the header row")
+                                   .arg(cells.size())
+                                   .arg(columns_.size()));
     }
     for (std::size_t i = 0; i < cells.size(); ++i) {
         const auto &parser = columns_[i].parser;
-        if (!parser || (onlyIds != nullptr && std::find(onlyIds->begin(), onlyIds->end(), parser->id()) == onlyIds->end())) {
+        if (!parser ||
+            (onlyIds != nullptr && std::find(onlyIds->begin(), onlyIds->end(), parser->id()) == onlyIds->end())) {
             continue;
         }
         if (!parser->store(cells[i], object)) {
-            error_ = reader_.errorAt(
-                reader_.placeOfCell(i),
-                Xlate("the cell \"%1\" of the column \"%2\" does not fit: %3 was expected")
-                    .arg(quoteOf(cells[i]), columns_[i].name, parser->expected()));
-            return false;
+            return reader_.errorAt(reader_.placeOfCell(i),
+                                   Xlate("the cell \"%1\" of the column \"%2\" does not fit: %3 was expected")
+                                       .arg(quoteOf(cells[i]), columns_[i].name, parser->expected()));
         }
     }
-    return true;
+    return std::nullopt;
 }
 
 void CsvObjectList::Sort(const std::vector<unsigned> &ids)
@@ -141,21 +161,23 @@ void CsvObjectList::Sort(const std::vector<unsigned> &ids)
         RowPlace place;
     };
     std::vector<Key> keys;
-    rewind();
+    batches_.reset();
+    batch_ = nullptr;
+    order_.reset();
+    reader_.seek(firstRow_.start, firstRow_.line);
     while (reader_.next()) {
-        if (keys.size() % progressRows == 0 && !goOn()) {
+        if (progress_ && keys.size() % RowBatch::most == 0 && !progress_(reader_.position())) {
+            stopped_ = true;
             return;
         }
         Key &key = keys.emplace_back();
         key.place = {reader_.rowStart(), reader_.rowLine()};
-        if (!storeCells(key.values, &ids)) {
+        error_ = storeCells(key.values, &ids);
+        if (error_) {
             return;
         }
     }
-    if (reader_.error()) {
-        error_ = reader_.error();
-        return;
-    }
+    error_ = reader_.error();
     std::vector<std::size_t> order(keys.size());
     std::iota(order.begin(), order.end(), std::size_t(0));
     std::stable_sort(order.begin(), order.end(), [&](std::size_t left, std::size_t right) {

@@ -2,10 +2,12 @@
 
 #include "CsvReader.h"
 #include "DataUnits.h"
+#include "RowBatches.h"
 #include "UDataObjectList.h"
 #include "ValueParser.h"
 
 #include <functional>
+#include <memory>
 #include <optional>
 
 namespace kareport
@@ -16,8 +18,8 @@ using FindVariable = std::function<std::optional<ValueParser>(const QString &nam
 /// Is told now and then how many bytes have been read. @return false to stop
 using ReadProgress = std::function<bool(std::size_t bytes)>;
 
-/// The rows of a CSV file as data objects, made one at a time while they are asked for in turn: the file is read once
-/// and no object is kept. When something is wrong with a row, the list ends there and `error` says what.
+/// The rows of a CSV file as data objects, made while they are asked for in turn: the file is read once and only a few
+/// objects exist at a time. When something is wrong with a row, the list ends there and `error` says what.
 class CsvObjectList : public UDataObjectList
 {
 public:
@@ -25,6 +27,7 @@ public:
     CsvObjectList(std::shared_ptr<const FileBytes> file, char delimiter, const FindVariable &findVariable,
                   ReadProgress progress);
 
+    /// Going back is possible, but reads the file from its first row again.
     UDataObject *GetAt(std::size_t index) override;
     /// Reads the sort keys of all rows and orders the places of the rows; they are then read in that order.
     void Sort(const std::vector<unsigned> &ids) override;
@@ -44,10 +47,11 @@ private:
     };
 
     void readHeader(const FindVariable &findVariable);
-    bool readRow();
-    bool storeCells(UDataObject &object, const std::vector<unsigned> *onlyIds);
-    bool goOn();
-    void rewind();
+    void start();
+    void fill(RowBatch &batch);
+    bool readRow(RowBatch &batch);
+    bool takeBatch();
+    std::optional<InputError> storeCells(UDataObject &object, const std::vector<unsigned> *onlyIds) const;
 
     std::shared_ptr<const FileBytes> file_;
     CsvReader reader_;
@@ -55,10 +59,12 @@ private:
     std::vector<Column> columns_;
     RowPlace firstRow_{};
     std::optional<std::vector<RowPlace>> order_; ///< of a sorted list
-    UDataObject row_;
-    std::size_t nextIndex_ = 0; ///< of the row that is read next
-    bool stopped_ = false;
+    std::size_t nextOrdered_ = 0;                ///< the row of `order_` that is read next
+    const RowBatch *batch_ = nullptr;
+    std::size_t batchStart_ = 0; ///< index of the batch's first row
     std::optional<InputError> error_;
+    bool stopped_ = false;
+    std::unique_ptr<RowBatches> batches_; ///< last, so that its thread ends before what it reads goes
 };
 
 } // namespace kareport

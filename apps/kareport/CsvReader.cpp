@@ -15,8 +15,8 @@ namespace
 enum ByteClass : unsigned char
 {
     ordinary = 0,
-    high,     ///< part of a character outside ASCII
-    special   ///< ends a cell or stands nowhere in a plain one
+    high,   ///< part of a character outside ASCII
+    special ///< ends a cell or stands nowhere in a plain one
 };
 
 constexpr std::string_view byteOrderMark = "\xEF\xBB\xBF";
@@ -227,8 +227,8 @@ TextPlace CsvReader::placeOf(std::size_t at) const
     const auto lines = std::count(before.begin(), before.end(), '\n');
     const std::size_t lineStart = lines == 0 ? 0 : before.rfind('\n') + 1;
     const std::string_view line = before.substr(lineStart);
-    const auto characters =
-        std::count_if(line.begin(), line.end(), [](char byte) { return (static_cast<unsigned char>(byte) & 0xC0) != 0x80; });
+    const auto characters = std::count_if(line.begin(), line.end(),
+                                          [](char byte) { return (static_cast<unsigned char>(byte) & 0xC0) != 0x80; });
     return {rowLine_ + lines, characters + 1};
 }
 

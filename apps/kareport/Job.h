@@ -90,8 +90,7 @@ struct Job
         int headingAfter;
     };
     struct Clear
-    {
-    };
+    {};
     struct Step
     {
         std::variant<Heading, Line, LineFeed, NewPage, Block, Table, Clear> action;

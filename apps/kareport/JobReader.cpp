@@ -135,7 +135,8 @@ QHash<QString, Job::DataSet> readData(const JsonNode &node, const QDir &folder)
             const QString text = delimiter.text();
             if (text.size() != 1 || text[0].unicode() > 127 || QStringLiteral("\"\r\n").contains(text[0]) ||
                 text[0].isNull()) {
-                delimiter.fail(Xlate("a text of one ASCII character that is neither a quote nor a line end was expected"));
+                delimiter.fail(
+                    Xlate("a text of one ASCII character that is neither a quote nor a line end was expected"));
             } else {
                 read.delimiter = text[0].toLatin1();
             }
@@ -165,7 +166,8 @@ std::optional<Job::Step> readStep(const JsonNode &node)
     }
     if (node["line"].exists()) {
         node.allowOnly({"line", "before", "after", "style"});
-        return step("line", Job::Line{node["line"].text(), before, readLines(node["after"], 1), node["style"].whole(0, 0, 3)});
+        return step("line",
+                    Job::Line{node["line"].text(), before, readLines(node["after"], 1), node["style"].whole(0, 0, 3)});
     }
     if (node["lineFeed"].exists()) {
         node.allowOnly({"lineFeed"});
@@ -177,7 +179,8 @@ std::optional<Job::Step> readStep(const JsonNode &node)
     }
     if (node["block"].exists()) {
         node.allowOnly({"block", "data", "before", "after"});
-        return step("block", Job::Block{node["block"].text(), node["data"].text(), before, readLines(node["after"], 0)});
+        return step("block",
+                    Job::Block{node["block"].text(), node["data"].text(), before, readLines(node["after"], 0)});
     }
     if (node["table"].exists()) {
         node.allowOnly({"table", "data", "before", "after", "headingAfter"});
@@ -204,7 +207,8 @@ void checkStep(const JsonNode &node, const Job &job)
             continue;
         }
         if (!job.reportTemplate) {
-            node.fail(Xlate("a \"%1\" needs a template: the key \"template\" was expected in the job").arg(QLatin1StringView(key)));
+            node.fail(Xlate("a \"%1\" needs a template: the key \"template\" was expected in the job")
+                          .arg(QLatin1StringView(key)));
         }
         const JsonNode data = node["data"];
         if (!data.exists()) {

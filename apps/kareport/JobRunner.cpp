@@ -59,13 +59,16 @@ public:
     void operator()(const Job::Block &step)
     {
         const sXmlReportBlock *block = report_.GetTemplate()->GetBlock(step.name);
-        if (!isWritable(block, step.name, Xlate("block"), [](const UXmlReportTpl &tpl, QStringList &names) { tpl.GetAllBlocks(names); })) {
+        if (!isWritable(block, step.name, Xlate("block"),
+                        [](const UXmlReportTpl &tpl, QStringList &names) { tpl.GetAllBlocks(names); }))
+        {
             return;
         }
         const auto list = openData(step.data, block->Use, true);
         const UDataObject *object = list ? list->GetAt(0) : nullptr;
         if (!takeError(list.get()) && list && object == nullptr) {
-            runner_.source_.fail(path_, Xlate("the data \"%1\" has no row: a block shows the first one").arg(step.data));
+            runner_.source_.fail(path_,
+                                 Xlate("the data \"%1\" has no row: a block shows the first one").arg(step.data));
         }
         if (object != nullptr && !failed()) {
             report_.WriteDataBlock(step.name, object, step.before, step.after);
@@ -75,7 +78,9 @@ public:
     void operator()(const Job::Table &step)
     {
         const sXmlReportTable *table = report_.GetTemplate()->GetTable(step.name);
-        if (!isWritable(table, step.name, Xlate("table"), [](const UXmlReportTpl &tpl, QStringList &names) { tpl.GetAllTables(names); })) {
+        if (!isWritable(table, step.name, Xlate("table"),
+                        [](const UXmlReportTpl &tpl, QStringList &names) { tpl.GetAllTables(names); }))
+        {
             return;
         }
         const auto list = openData(step.data, table->Use, false);
@@ -95,13 +100,15 @@ private:
         if (record == nullptr) {
             QStringList names;
             getNames(tpl, names);
-            runner_.source_.fail(path_, Xlate("the template has no %1 named \"%2\": one of %3 was expected")
-                                            .arg(what, name, names.isEmpty() ? Xlate("none") : names.join(QStringLiteral(", "))));
+            runner_.source_.fail(
+                path_, Xlate("the template has no %1 named \"%2\": one of %3 was expected")
+                           .arg(what, name, names.isEmpty() ? Xlate("none") : names.join(QStringLiteral(", "))));
             return false;
         }
         if (tpl.GetDictionary(record->Use) == nullptr) {
-            runner_.source_.fail(path_, Xlate("the %1 \"%2\" cannot be written: the template has no dictionary named \"%3\"")
-                                            .arg(what, name, record->Use));
+            runner_.source_.fail(path_,
+                                 Xlate("the %1 \"%2\" cannot be written: the template has no dictionary named \"%3\"")
+                                     .arg(what, name, record->Use));
             return false;
         }
         return true;
@@ -112,7 +119,8 @@ private:
     {
         const Job::DataSet &set = *runner_.job_.data.constFind(name);
         const UXmlReportTpl *tpl = report_.GetTemplate();
-        const FindVariable findVariable = [tpl, &set, dictionary](const QString &variable) -> std::optional<ValueParser> {
+        const FindVariable findVariable = [tpl, &set,
+                                           dictionary](const QString &variable) -> std::optional<ValueParser> {
             qint32 id = 0;
             qint32 type = 0;
             if (!tpl->FindVariable(dictionary, variable, id, type)) {
@@ -188,7 +196,8 @@ std::optional<InputError> JobRunner::prepare()
 {
     // What is printed must not depend on the preferences of whoever runs the job.
     setProfileStore(makeMemoryProfile());
-    WriteProfileString(QString(), QStringLiteral("ReportPrintHash"), job_.options.printHash ? QStringLiteral("1") : QStringLiteral("0"));
+    WriteProfileString(QString(), QStringLiteral("ReportPrintHash"),
+                       job_.options.printHash ? QStringLiteral("1") : QStringLiteral("0"));
     if (job_.page.margins) {
         WriteProfileString(QString(), QStringLiteral("Report Margins"), marginsToText(*job_.page.margins));
     }

@@ -236,7 +236,8 @@ void JsonNode::allowOnly(std::initializer_list<const char *> allowed) const
                            [](const char *name) { return QString::fromLatin1(name); });
             JsonPath path = path_;
             path.emplace_back(key);
-            source_.fail(path, Xlate("unknown key \"%1\": %2 expected").arg(key, names.join(QStringLiteral(", "))), true);
+            source_.fail(path, Xlate("unknown key \"%1\": %2 expected").arg(key, names.join(QStringLiteral(", "))),
+                         true);
         }
     }
 }

@@ -78,8 +78,7 @@ public:
 private:
     JsonNode(JsonSource &source, QJsonValue value, JsonPath path)
         : source_(source), value_(std::move(value)), path_(std::move(path))
-    {
-    }
+    {}
 
     JsonSource &source_;
     QJsonValue value_;

@@ -23,7 +23,8 @@ public:
     char peek()
     {
         while (at_ < json_.size() && (json_[at_] == ' ' || json_[at_] == '\t' || json_[at_] == '\n' ||
-                                      json_[at_] == '\r' || static_cast<unsigned char>(json_[at_]) >= 0x80)) {
+                                      json_[at_] == '\r' || static_cast<unsigned char>(json_[at_]) >= 0x80))
+        {
             ++at_; // white space, and a byte-order mark in front
         }
         return at_ < json_.size() ? json_[at_] : '\0';

@@ -26,9 +26,11 @@ std::optional<QString> writeOutput(UReportDoc &report, const Output &output)
     const LineEnds lineEnds = lineEndsOf(output.kind);
     if (output.isStandardOutput()) {
         QFile file;
-        const bool done = file.open(stdout, QIODevice::WriteOnly) && writeReportText(file, text, lineEnds) && file.flush();
+        const bool done =
+            file.open(stdout, QIODevice::WriteOnly) && writeReportText(file, text, lineEnds) && file.flush();
         return done ? std::nullopt
-                    : std::optional(Xlate("the report could not be written to standard output: %1").arg(file.errorString()));
+                    : std::optional(
+                          Xlate("the report could not be written to standard output: %1").arg(file.errorString()));
     }
     if (output.kind == OutputKind::Report && text.isEmpty()) {
         // Saving an empty report makes no file.

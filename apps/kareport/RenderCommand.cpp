@@ -22,8 +22,9 @@ QJsonObject shortJob(const RenderCommand &command)
 {
     const QString set = QStringLiteral("data");
     const bool isTable = !command.table.isEmpty();
-    const QJsonObject step = {{isTable ? QStringLiteral("table") : QStringLiteral("block"), isTable ? command.table : command.block},
-                              {set, set}};
+    const QJsonObject step = {
+        {isTable ? QStringLiteral("table") : QStringLiteral("block"), isTable ? command.table : command.block},
+        {set, set}};
     return {{QStringLiteral("template"), QJsonObject{{QStringLiteral("file"), command.templateFile},
                                                      {QStringLiteral("name"), command.templateName}}},
             {set, QJsonObject{{set, QJsonObject{{QStringLiteral("csv"), command.data}}}}},
@@ -73,11 +74,14 @@ ExitStatus writeOutputs(UReportDoc &report, const Job &job, Progress &progress, 
 
 std::optional<QString> RenderCommand::usageError() const
 {
-    const bool isShort = !templateFile.isEmpty() || !templateName.isEmpty() || !table.isEmpty() || !block.isEmpty() || !data.isEmpty();
+    const bool isShort =
+        !templateFile.isEmpty() || !templateName.isEmpty() || !table.isEmpty() || !block.isEmpty() || !data.isEmpty();
     if (job.isEmpty() != isShort) {
         return Xlate("either a job file or --template, --name, --table or --block, and --data were expected");
     }
-    if (isShort && (templateFile.isEmpty() || templateName.isEmpty() || data.isEmpty() || table.isEmpty() == block.isEmpty())) {
+    if (isShort &&
+        (templateFile.isEmpty() || templateName.isEmpty() || data.isEmpty() || table.isEmpty() == block.isEmpty()))
+    {
         return Xlate("--template, --name, --data and one of --table and --block were expected");
     }
     if (!as.isEmpty() && !outputKindFromName(as)) {
@@ -85,7 +89,8 @@ std::optional<QString> RenderCommand::usageError() const
     }
     for (const QString &file : outputs) {
         if (as.isEmpty() && !outputKindFromFile(file)) {
-            return Xlate("the ending of \"%1\" says no kind: --as with one of %2 was expected").arg(file, outputKindNames());
+            return Xlate("the ending of \"%1\" says no kind: --as with one of %2 was expected")
+                .arg(file, outputKindNames());
         }
     }
     return std::nullopt;

@@ -26,7 +26,8 @@ Expected<TemplateFile> readTemplateSource(const QString &path)
         return InputError{path, std::nullopt, Xlate("the template file cannot be read")};
     }
     if (file->text().isEmpty()) {
-        return InputError{path, TextPlace(), Xlate("the template file is empty: a <ReportTemplate> element was expected")};
+        return InputError{path, TextPlace(),
+                          Xlate("the template file is empty: a <ReportTemplate> element was expected")};
     }
     return std::move(*file);
 }
@@ -35,8 +36,7 @@ InputError whyNotLoaded(const QString &path, const TemplateFile &file, const QSt
 {
     for (const TemplateRemark &remark : checkTemplates(file)) {
         if (remark.isError) {
-            return {path, remark.place,
-                    Xlate("the template \"%1\" cannot be loaded: %2").arg(name, remark.text)};
+            return {path, remark.place, Xlate("the template \"%1\" cannot be loaded: %2").arg(name, remark.text)};
         }
     }
     return {path, TextPlace(),

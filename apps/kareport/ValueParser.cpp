@@ -135,7 +135,8 @@ bool parseSexagesimal(std::string_view text, double &degrees)
         double value = 0;
         const bool isLast = end == text.size() || text.substr(end) == marks[part];
         if (end == 0 || !parseNumber(text.substr(0, end), value) || (part > 0 && value >= 60) ||
-            (!isLast && value != std::floor(value))) {
+            (!isLast && value != std::floor(value)))
+        {
             return false;
         }
         degrees += value / partsPerDegree[part];

@@ -41,37 +41,46 @@ struct RenderOptions
 
     kareport::RenderCommand command() const
     {
-        return {text(job),     text(templateFile), text(templateName), text(table), text(block),
-                text(data),    texts(outputs),     text(as),           texts(sets), progress,
-                quiet};
+        return {text(job),      text(templateFile), text(templateName), text(table), text(block), text(data),
+                texts(outputs), text(as),           texts(sets),        progress,    quiet};
     }
 };
 
 CLI::App *addRender(CLI::App &program, RenderOptions &options)
 {
-    CLI::App *render = program.add_subcommand("render", "Make a report from a job file, or from a template and a data file");
+    CLI::App *render =
+        program.add_subcommand("render", "Make a report from a job file, or from a template and a data file");
     render->add_option("JOB", options.job, "Job file (JSON)");
-    render->add_option("-t,--template", options.templateFile, "Template file, instead of a job file")->type_name("FILE");
+    render->add_option("-t,--template", options.templateFile, "Template file, instead of a job file")
+        ->type_name("FILE");
     render->add_option("-n,--name", options.templateName, "Name of the template in the file")->type_name("NAME");
-    render->add_option("--table", options.table, "Table of the template that the data is written through")->type_name("NAME");
-    render->add_option("--block", options.block, "Block of the template that the first row is written through")->type_name("NAME");
-    render->add_option("-d,--data", options.data, "Data file (CSV with a header row of variable names)")->type_name("FILE");
-    render->add_option("-o,--output", options.outputs, "Output file instead of the job's; - for standard output. May stand several times")
+    render->add_option("--table", options.table, "Table of the template that the data is written through")
+        ->type_name("NAME");
+    render->add_option("--block", options.block, "Block of the template that the first row is written through")
+        ->type_name("NAME");
+    render->add_option("-d,--data", options.data, "Data file (CSV with a header row of variable names)")
+        ->type_name("FILE");
+    render
+        ->add_option("-o,--output", options.outputs,
+                     "Output file instead of the job's; - for standard output. May stand several times")
         ->type_name("FILE")
         ->expected(1)
         ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
-    render->add_option("--as", options.as, "Kind of the outputs where their names do not say it: rep, text")->type_name("KIND");
-    render->add_option("--set", options.sets, "Set a key of the job, as settings.lengthUnit=ft. May stand several times")
+    render->add_option("--as", options.as, "Kind of the outputs where their names do not say it: rep, text")
+        ->type_name("KIND");
+    render
+        ->add_option("--set", options.sets, "Set a key of the job, as settings.lengthUnit=ft. May stand several times")
         ->type_name("KEY=VALUE")
         ->expected(1)
         ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
     render->add_flag("--progress", options.progress, "Show how far the work has come");
     render->add_flag("--quiet", options.quiet, "Say nothing but errors");
-    render->footer("Examples:\n"
-                   "  kareport render stakeout.json\n"
-                   "  kareport render stakeout.json -o - | less\n"
-                   "  kareport render stakeout.json --set settings.lengthUnit=usft -o stakeout-ft.rep\n"
-                   "  kareport render --template survey.xml --name CONTROL --table Points --data points.csv -o points.txt");
+    render->footer(
+        "Examples:\n"
+        "  kareport render stakeout.json\n"
+        "  kareport render stakeout.json -o - | less\n"
+        "  kareport render stakeout.json --set settings.lengthUnit=usft -o stakeout-ft.rep\n"
+        "  kareport render --template survey.xml --name CONTROL --table Points --data points.csv -o points.txt");
     return render;
 }
 
@@ -95,12 +104,14 @@ int main(int argc, char **argv)
     bool templatesJson = false;
     CLI::App *templatesCommand = program.add_subcommand("templates", "List the templates of a template file");
     templatesCommand->add_option("FILE", templatesFile, "Template file")->required();
-    templatesCommand->add_option("-n,--name", templatesName, "Show this template's tables, blocks, dictionaries and options")
+    templatesCommand
+        ->add_option("-n,--name", templatesName, "Show this template's tables, blocks, dictionaries and options")
         ->type_name("NAME");
     templatesCommand->add_flag("--json", templatesJson, "Write JSON, for programs");
 
     std::string checkFile;
-    CLI::App *checkCommand = program.add_subcommand("check", "Say what in a template file is not read, or not as it looks");
+    CLI::App *checkCommand =
+        program.add_subcommand("check", "Say what in a template file is not read, or not as it looks");
     checkCommand->add_option("FILE", checkFile, "Template file")->required();
     checkCommand->footer("Each remark is one line, file:line:column: warning|error: text.\n"
                          "Exit status: 0 without errors, 2 with.");

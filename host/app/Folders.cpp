@@ -25,7 +25,8 @@ QString GetLibraryDir(bool /*reserved*/)
     if (!folders().library.isEmpty()) {
         return folders().library;
     }
-    return QStandardPaths::writableLocation(QStandardPaths::GenericDataLocation) + QStringLiteral("/kareport/templates");
+    return QStandardPaths::writableLocation(QStandardPaths::GenericDataLocation) +
+           QStringLiteral("/kareport/templates");
 }
 
 QString GetStartPathName()

@@ -20,8 +20,7 @@ public:
     explicit SettingsProfile(const QString &path)
         : settings_(path.isEmpty() ? std::make_unique<QSettings>(QStringLiteral("KaReport"), QStringLiteral("KaReport"))
                                    : std::make_unique<QSettings>(path, QSettings::IniFormat))
-    {
-    }
+    {}
 
     QString read(const QString &section, const QString &entry, const QString &fallback) const override
     {

@@ -48,9 +48,7 @@ QString CViewPane::GetCaption() const
     return windowNumber_ > 0 ? text_ + u':' + QString::number(windowNumber_) : text_;
 }
 
-void CViewPane::UpdateTitle()
-{
-}
+void CViewPane::UpdateTitle() {}
 
 void CViewPane::ShowPane(bool show)
 {

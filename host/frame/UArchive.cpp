@@ -1,8 +1,6 @@
 #include "UArchive.h"
 
-UArchive::UArchive(QIODevice &device, Mode mode, QString path) : device_(device), mode_(mode), path_(std::move(path))
-{
-}
+UArchive::UArchive(QIODevice &device, Mode mode, QString path) : device_(device), mode_(mode), path_(std::move(path)) {}
 
 void UArchive::Write(QByteArrayView bytes)
 {

@@ -8,10 +8,12 @@
 
 UDocTemplate::UDocTemplate(unsigned resourceId, DocumentFactory makeDocument, PaneFactory makePane,
                            ViewFactory makeView, QString creatorName, int /*savesInFrame*/, int /*reserved*/)
-    : resourceId_(resourceId), makeDocument_(std::move(makeDocument)), makePane_(std::move(makePane)),
-      makeView_(std::move(makeView)), creatorName_(std::move(creatorName))
-{
-}
+    : resourceId_(resourceId),
+      makeDocument_(std::move(makeDocument)),
+      makePane_(std::move(makePane)),
+      makeView_(std::move(makeView)),
+      creatorName_(std::move(creatorName))
+{}
 
 UDocTemplate::~UDocTemplate()
 {

@@ -140,9 +140,7 @@ bool UDocument::OnSaveDocument(const QString &path)
     return true;
 }
 
-void UDocument::Serialize(UArchive & /*archive*/)
-{
-}
+void UDocument::Serialize(UArchive & /*archive*/) {}
 
 bool UDocument::DoSave(const QString &path, bool replace)
 {
@@ -206,14 +204,8 @@ void UDocument::OnCloseDocument()
     }
 }
 
-void UDocument::DeleteContents()
-{
-}
+void UDocument::DeleteContents() {}
 
-void UDocument::OnDocumentEvent(DocumentEvent /*event*/)
-{
-}
+void UDocument::OnDocumentEvent(DocumentEvent /*event*/) {}
 
-void UDocument::OnReportClosed(UDocument * /*report*/)
-{
-}
+void UDocument::OnReportClosed(UDocument * /*report*/) {}

@@ -17,9 +17,7 @@ void UView::OnInitialUpdate()
     OnUpdate(nullptr, 0, nullptr);
 }
 
-void UView::OnUpdate(UView * /*sender*/, long /*hint*/, void * /*hintObject*/)
-{
-}
+void UView::OnUpdate(UView * /*sender*/, long /*hint*/, void * /*hintObject*/) {}
 
 bool UView::IsVisible() const
 {

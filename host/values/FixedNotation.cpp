@@ -28,28 +28,21 @@ constexpr auto digitPairs = [] {
     return pairs;
 }();
 
-/// Writes the last `count` digits of a number before `end`, with leading zeros.
-char *writeDigitsBackwards(char *end, std::uint64_t number, int count)
+/// Takes two digits off the end of a number and writes them before `end`.
+char *takePair(char *end, std::uint64_t &number)
 {
-    for (; count >= 2; count -= 2) {
-        const auto pair = static_cast<std::size_t>(number % 100) * 2;
-        number /= 100;
-        *--end = digitPairs[pair + 1];
-        *--end = digitPairs[pair];
-    }
-    if (count > 0) {
-        *--end = static_cast<char>('0' + number % 10);
-    }
+    const auto pair = static_cast<std::size_t>(number % 100) * 2;
+    number /= 100;
+    *--end = digitPairs[pair + 1];
+    *--end = digitPairs[pair];
     return end;
 }
 
-int countDigits(std::uint64_t number)
+char *takeDigit(char *end, std::uint64_t &number)
 {
-    int count = 1;
-    for (std::uint64_t rest = number; rest >= 10; rest /= 10) {
-        ++count;
-    }
-    return count;
+    *--end = static_cast<char>('0' + number % 10);
+    number /= 10;
+    return end;
 }
 
 } // namespace
@@ -86,16 +79,22 @@ bool FixedNotation::writeByScaling(double magnitude, int decimals)
 
     char *const end = short_.data() + short_.size();
     char *begin = end;
-    const auto unit = static_cast<std::uint64_t>(power);
-    std::uint64_t whole = count;
     if (decimals > 0) {
-        whole = count / unit;
-        begin = writeDigitsBackwards(begin, count - whole * unit, decimals);
+        for (int left = decimals; left > 1; left -= 2) {
+            begin = takePair(begin, count);
+        }
+        if (decimals % 2 != 0) {
+            begin = takeDigit(begin, count);
+        }
         *--begin = '.';
     }
-    begin = writeDigitsBackwards(begin, whole, countDigits(whole));
+    while (count >= 10) {
+        begin = takePair(begin, count);
+    }
+    if (count > 0 || begin == end || *begin == '.') {
+        begin = takeDigit(begin, count);
+    }
     size_ = static_cast<std::size_t>(end - begin);
-    std::copy(begin, end, short_.data());
     return true;
 }
 

@@ -18,7 +18,10 @@ public:
     FixedNotation(double value, int decimals);
 
     /// The digits, with a point when there are decimals; valid as long as this object.
-    std::string_view digits() const { return long_.empty() ? std::string_view(short_.data(), size_) : long_; }
+    std::string_view digits() const
+    {
+        return long_.empty() ? std::string_view(short_.data() + short_.size() - size_, size_) : long_;
+    }
     /// Whether every digit is a 0.
     bool isZero() const { return zero_; }
 
@@ -26,7 +29,7 @@ private:
     bool writeByScaling(double magnitude, int decimals);
     void writeExactly(double magnitude, int decimals);
 
-    std::array<char, 40> short_;
+    std::array<char, 40> short_; ///< the digits stand at its end
     std::size_t size_ = 0;
     std::string long_; ///< used for what does not fit into `short_`
     bool zero_ = false;

@@ -10,9 +10,7 @@ namespace
 constexpr std::size_t firstCapacity = 512;
 }
 
-TextBuffer::TextBuffer() : data_(std::make_unique_for_overwrite<char16_t[]>(firstCapacity)), capacity_(firstCapacity)
-{
-}
+TextBuffer::TextBuffer() : data_(std::make_unique_for_overwrite<char16_t[]>(firstCapacity)), capacity_(firstCapacity) {}
 
 TextBuffer::~TextBuffer() = default;
 

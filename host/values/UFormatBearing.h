@@ -15,8 +15,7 @@ public:
     /// @param reference  0 counts from north, 1 from south
     UFormatBearing(unsigned unit, qint16 style, qint32 decimals, qint16 padding, unsigned reference)
         : unit_(unit), style_(style), decimals_(decimals), padding_(padding), reference_(reference)
-    {
-    }
+    {}
 
     /// Replaces `text` by the bearing; a value that is not finite gives "".
     void ConvertToDisplayString(double value, QString &text) const;

@@ -60,18 +60,24 @@ void UJobSettings::appendUnitLength(TextBuffer &out, double value, bool fromInte
         value /= kareport::metresIn(lengthUnit);
     }
     const FixedNotation fixed(value, decimals == -1 ? lengthDecimals : decimals);
-    const std::size_t start = out.size();
-    if (!(blankZero && fixed.isZero())) {
-        if (value < 0 && !fixed.isZero()) {
-            out.append(u'-');
-        }
-        out.appendAscii(fixed.digits());
-        if (withUnit) {
-            appendUnit(out);
-        }
+    if (blankZero && fixed.isZero()) {
+        out.appendFill(static_cast<std::size_t>(std::max(width, 0)), u' ');
+        return;
     }
-    if (width > 0) {
-        out.pad(start, width);
+    const bool negative = value < 0 && !fixed.isZero();
+    std::size_t length = fixed.digits().size() + (negative ? 1U : 0U);
+    if (withUnit) {
+        length += 1 + static_cast<std::size_t>(kareport::symbolOf(lengthUnit).size());
+    }
+    if (width > 0 && static_cast<std::size_t>(width) > length) {
+        out.appendFill(static_cast<std::size_t>(width) - length, u' ');
+    }
+    if (negative) {
+        out.append(u'-');
+    }
+    out.appendAscii(fixed.digits());
+    if (withUnit) {
+        appendUnit(out);
     }
 }
 

@@ -17,9 +17,9 @@ class KAREPORT_EXPORT UJobSettings
 public:
     enum class StationFormat
     {
-        Plain,          ///< 12345.678
-        HundredsPlus,   ///< 123+45.678
-        ThousandsPlus   ///< 12+345.678
+        Plain,        ///< 12345.678
+        HundredsPlus, ///< 123+45.678
+        ThousandsPlus ///< 12+345.678
     };
 
     kareport::LengthUnit lengthUnit = kareport::LengthUnit::Metre;

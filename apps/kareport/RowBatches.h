@@ -1,0 +1,55 @@
+#pragma once
+
+#include "InputError.h"
+#include "UDataObject.h"
+
+#include <array>
+#include <cstddef>
+#include <functional>
+#include <optional>
+#include <semaphore>
+#include <thread>
+#include <vector>
+
+namespace kareport
+{
+
+/// Rows that were read one behind the other. The objects are kept and refilled from batch to batch.
+struct RowBatch
+{
+    static constexpr std::size_t most = 512;
+
+    std::vector<UDataObject> objects = std::vector<UDataObject>(most);
+    std::size_t count = 0;           ///< objects in use
+    bool isLast = false;             ///< no row follows, or none that can be read
+    std::optional<InputError> error; ///< what is wrong with the row behind the last
+    std::size_t position = 0;        ///< where reading has come to in the file
+};
+
+/// Reads batches of rows ahead of whoever uses them: while one batch is used, the next is read on another thread.
+class RowBatches
+{
+public:
+    /// @param fill  reads the next rows into a batch. It is called on a thread of its own, never twice at a time, and not
+    ///              any more after the last batch
+    explicit RowBatches(std::function<void(RowBatch &)> fill);
+    ~RowBatches();
+    RowBatches(const RowBatches &) = delete;
+    RowBatches &operator=(const RowBatches &) = delete;
+
+    /// The next batch, valid until the next call; not to be called after the last one.
+    const RowBatch &next();
+
+private:
+    void read(const std::stop_token &stop);
+
+    std::function<void(RowBatch &)> fill_;
+    std::array<RowBatch, 2> batches_;
+    std::size_t used_ = 1; ///< the batch that was handed out last
+    bool started_ = false;
+    std::counting_semaphore<2> free_{2};
+    std::counting_semaphore<2> ready_{0};
+    std::jthread thread_;
+};
+
+} // namespace kareport

@@ -1,0 +1,27 @@
+#include "DefaultPrinter.h"
+#include "Profile.h"
+#include "UReportDoc.h"
+
+#include <benchmark/benchmark.h>
+
+namespace
+{
+
+/// Lines of 80 characters; compare the rates at N and 10 N.
+void writeLines(benchmark::State &state)
+{
+    kareport::setProfileStore(kareport::makeMemoryProfile());
+    const QString line(80, u'x');
+    for (auto _ : state) {
+        UReportDoc report;
+        report.SetHeaderFlag(true);
+        for (qint64 i = 0; i < state.range(0); ++i) {
+            report.WriteLine(line, 0, 1, 0);
+        }
+        benchmark::DoNotOptimize(report.GetData());
+    }
+    state.SetItemsProcessed(state.iterations() * state.range(0));
+}
+BENCHMARK(writeLines)->Arg(100'000)->Arg(1'000'000)->Arg(5'000'000)->Unit(benchmark::kMillisecond);
+
+} // namespace

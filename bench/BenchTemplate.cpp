@@ -1,0 +1,95 @@
+#include "UXmlReportTpl.h"
+
+#include <QTemporaryFile>
+
+#include <benchmark/benchmark.h>
+
+namespace
+{
+
+/// Templates of about 5 KB each.
+QByteArray makeTemplates(qint64 count)
+{
+    QByteArray text;
+    for (qint64 i = 0; i < count; ++i) {
+        text += "<ReportTemplate>\n\t<Name>T" + QByteArray::number(i) +
+                "</Name><Title>Template</Title>\n\t<Tables><Table>"
+                "<Name>Points</Name><Use>Dic</Use><OutputList>\n";
+        for (int field = 0; field < 24; ++field) {
+            text += "\t\t<Field><VariableName>Variable" + QByteArray::number(field) +
+                    "</VariableName><Label>Label</Label><Format>12.3</Format><Align>RIGHT</Align></Field>\n";
+        }
+        text +=
+            "\t</OutputList></Table></Tables>\n\t<Dictionaries><Dictionary><DictionaryName>Dic</DictionaryName><VariableList>\n";
+        for (int variable = 0; variable < 24; ++variable) {
+            const QByteArray number = QByteArray::number(variable);
+            text += "\t\t<Variable><ID>" + number + "</ID><VariableName>Variable" + number +
+                    "</VariableName><Type>COORDINATE</Type></Variable>\n";
+        }
+        text +=
+            "\t</VariableList></Dictionary></Dictionaries>\n\t<Options><Separator>32</Separator></Options>\n</ReportTemplate>\n";
+    }
+    return text;
+}
+
+/// 200 templates are about 1 MB; compare the bytes a second at 200 and 2000.
+void loadTemplate(benchmark::State &state)
+{
+    QTemporaryFile file;
+    file.open();
+    const QByteArray text = makeTemplates(state.range(0));
+    file.write(text);
+    file.flush();
+    const QString name = QStringLiteral("t%1").arg(state.range(0) - 1);
+    for (auto _ : state) {
+        UXmlReportTpl reportTemplate;
+        if (!reportTemplate.LoadTemplate(file.fileName(), name)) {
+            state.SkipWithError("the template was not loaded");
+        }
+    }
+    state.SetBytesProcessed(state.iterations() * text.size());
+}
+BENCHMARK(loadTemplate)->Arg(200)->Arg(2000)->Unit(benchmark::kMillisecond);
+
+/// One table whose fields end with the short closing tag; compare the rates at N and 10 N.
+void loadManyFields(benchmark::State &state)
+{
+    QByteArray text = "<ReportTemplate><Name>A</Name><Tables><Table><Name>T</Name><Use>D</Use><OutputList>";
+    for (qint64 i = 0; i < state.range(0); ++i) {
+        text += "<Field><Label>L" + QByteArray::number(i) + "</Label></>     ";
+    }
+    text += "</OutputList></Table></Tables></ReportTemplate>";
+    QTemporaryFile file;
+    file.open();
+    file.write(text);
+    file.flush();
+    for (auto _ : state) {
+        UXmlReportTpl reportTemplate;
+        reportTemplate.LoadTemplate(file.fileName(), QStringLiteral("A"));
+        const sXmlReportTable *table = reportTemplate.GetTable(QStringLiteral("T"));
+        if (table == nullptr || qint64(table->Fields.size()) != state.range(0)) {
+            state.SkipWithError("fields were lost");
+        }
+    }
+    state.SetItemsProcessed(state.iterations() * state.range(0));
+}
+BENCHMARK(loadManyFields)->Arg(10'000)->Arg(100'000)->Unit(benchmark::kMillisecond);
+
+/// Opening tags without closing ones; compare the bytes a second at N and 10 N.
+void scanUnclosedTags(benchmark::State &state)
+{
+    const QByteArray text = "<ReportTemplate><Name>A</Name><Tables><Table><Name>T</Name>" +
+                            QByteArray("<OutputList><Field><Label>").repeated(state.range(0)) + "</ReportTemplate>";
+    QTemporaryFile file;
+    file.open();
+    file.write(text);
+    file.flush();
+    for (auto _ : state) {
+        UXmlReportTpl reportTemplate;
+        benchmark::DoNotOptimize(reportTemplate.LoadTemplate(file.fileName(), QStringLiteral("A")));
+    }
+    state.SetBytesProcessed(state.iterations() * text.size());
+}
+BENCHMARK(scanUnclosedTags)->Arg(10'000)->Arg(100'000)->Unit(benchmark::kMillisecond);
+
+} // namespace

@@ -1,0 +1,25 @@
+#!/usr/bin/env bash
+# Rules that a compiler does not check. Prints every line that breaks one.
+set -euo pipefail
+cd "$(dirname "$0")/.."
+
+failed=0
+report() { # what is wrong, and the lines that grep has found
+    if [ -n "$2" ]; then
+        printf '%s\n%s\n' "$1" "$2"
+        failed=1
+    fi
+}
+sources=$(find host templates output report apps tests bench fuzz -name '*.h' -o -name '*.cpp' | sort)
+
+report 'Headers are included by their name alone, so that layers hold:' \
+    "$(grep -nE '#include "(\.\./|[a-z]+/)' $sources || true)"
+report 'Operating-system headers belong into files named for the system (*Posix.cpp, *Windows.cpp):' \
+    "$(grep -nE '#include <(unistd|fcntl|sys/[a-z]+|windows|pthread)(\.h)?>' $sources | grep -vE '(Posix|Windows)\.cpp:' || true)"
+report 'A test is not skipped without a reason behind it:' \
+    "$(grep -nE 'GTEST_SKIP\(\);|DISABLED_' $sources || true)"
+report 'No shell is started:' \
+    "$(grep -nE '\b(std::)?system\(|\bpopen\(' $sources | grep -v 'QLocale::system()' || true)"
+report 'Every header guards itself:' \
+    "$(for header in $(printf '%s\n' $sources | grep '\.h$'); do head -n 1 "$header" | grep -q '#pragma once' || echo "$header"; done)"
+exit $failed

@@ -1,0 +1,11 @@
+#!/usr/bin/env bash
+# Makes tests/golden/ anew from the examples. Read the difference before it is committed.
+set -euo pipefail
+cd "$(dirname "$0")/.."
+
+scripts/build.sh release
+for job in examples/*.json; do
+    name=$(basename "$job" .json)
+    build/release/apps/kareport/kareport render "$job" -o "tests/golden/$name.rep" -o "tests/golden/$name.txt"
+done
+git --no-pager diff --stat -- tests/golden

@@ -1,0 +1,213 @@
+#include "ReportFixture.h"
+
+#include <gtest/gtest.h>
+
+#include <vector>
+
+namespace
+{
+
+TEST(UReportDocTitle, ReportsOfOneNameAreNumberedWhileTheirPanesAreOpen)
+{
+    const FixedSurroundings surroundings;
+    ReportApplication application;
+    const QString name = QStringLiteral("Traverse");
+    UReportDoc *first = application.create(name);
+    UReportDoc *second = application.create(name);
+    UReportDoc *third = application.create(name);
+    ASSERT_NE(third, nullptr);
+    EXPECT_EQ(first->GetTitle(), QStringLiteral("Traverse"));
+    EXPECT_EQ(second->GetTitle(), QStringLiteral("Traverse 2"));
+    EXPECT_EQ(third->GetTitle(), QStringLiteral("Traverse 3"));
+    for (UReportDoc *report : {first, second, third}) {
+        EXPECT_EQ(report->UDocument::GetTitle(), report->GetTitle());
+        EXPECT_EQ(report->GetFrameWindow()->GetWindowTextW(), report->GetTitle());
+        EXPECT_EQ(report->GetReportFileName(), name) << "the file name is not numbered";
+    }
+    second->OnCloseDocument();
+    EXPECT_EQ(application.create(name)->GetTitle(), QStringLiteral("Traverse 2")) << "the number is free again";
+}
+
+TEST(UReportDocTitle, TheHeaderKeepsTheTitleAsGiven)
+{
+    const FixedSurroundings surroundings;
+    CViewPane pane;
+    pane.SetWindowTextW(QStringLiteral("Traverse"));
+    UReportDoc report;
+    report.FixPage(72, 80);
+    report.SetTitle(QStringLiteral("Traverse"));
+    EXPECT_EQ(report.GetTitle(), QStringLiteral("Traverse 2"));
+    report.SetHeaderFlag(true);
+    report.NewPage(0);
+    EXPECT_EQ(textOf(report), reportLines(headerOf(QStringLiteral("Traverse"), 1) + QStringLiteral("\n\n\n\n")));
+}
+
+TEST(UReportDocTitle, TheFirstFreeNumberFrom2IsTaken)
+{
+    struct Row
+    {
+        QStringList captions;
+        QString title;
+        QString expected;
+        const char *reason;
+    };
+    const QString n = QStringLiteral("N");
+    const QString n2 = QStringLiteral("N 2");
+    const QString n3 = QStringLiteral("N 3");
+    const Row rows[] = {
+        {{}, n, n, "no pane is open"},
+        {{QStringLiteral("other")}, n, n, "no pane of that caption"},
+        {{n}, n, n2, "one blank and the number"},
+        {{QStringLiteral("n")}, n, n2, "case does not matter"},
+        {{n2}, n, n, "only the numbered one is open"},
+        {{n3, n2, n}, n, QStringLiteral("N 4"), "searched again from the first caption"},
+        {{n, n3}, n, n2, "a gap is filled"},
+        {{n, n}, n, n2, "a caption that is open twice counts once"},
+        {{n, n2}, n2, QStringLiteral("N 2 2"), "a given number is part of the title"},
+        {{QStringLiteral("N ")}, n, n, "a blank makes another caption"},
+        {{n + QStringLiteral(" long")}, n, n, "the whole caption counts"},
+        {{QString::fromUtf8("\xC3\x9C")},
+         QString::fromUtf8("\xC3\xBC"),
+         QString::fromUtf8("\xC3\xBC 2"),
+         "case does not matter beyond ASCII"},
+    };
+    for (const Row &row : rows) {
+        const FixedSurroundings surroundings;
+        std::vector<std::unique_ptr<CViewPane>> panes;
+        for (const QString &caption : row.captions) {
+            panes.push_back(std::make_unique<CViewPane>());
+            panes.back()->SetWindowTextW(caption);
+        }
+        UReportDoc report;
+        report.SetTitle(row.title);
+        EXPECT_EQ(report.GetTitle(), row.expected) << row.reason;
+        EXPECT_EQ(report.UDocument::GetTitle(), row.expected) << row.reason;
+    }
+}
+
+TEST(UReportDocTitle, AReportsOwnPaneCountsAsOpen)
+{
+    const FixedSurroundings surroundings;
+    ReportApplication application;
+    UReportDoc *report = application.create(QStringLiteral("N"));
+    report->SetTitle(QStringLiteral("N"));
+    EXPECT_EQ(report->GetTitle(), QStringLiteral("N 2"));
+    report->SetTitle(QStringLiteral("N"));
+    EXPECT_EQ(report->GetTitle(), QStringLiteral("N")) << "its caption is N 2 by now";
+}
+
+TEST(UReportDocTitle, TheFrameWindowIsThePaneOfTheFirstReportView)
+{
+    const FixedSurroundings surroundings;
+    UReportDoc report;
+    report.SetAutoDelete(false);
+    EXPECT_EQ(report.GetFrameWindow(), nullptr) << "no view";
+    CViewPane plain;
+    CViewPane first;
+    CViewPane second;
+    showIn<UView>(plain, report);
+    EXPECT_EQ(report.GetFrameWindow(), nullptr) << "no view that shows the report";
+    showIn<TestReportView>(first, report);
+    showIn<TestReportView>(second, report);
+    EXPECT_EQ(report.GetFrameWindow(), &first);
+}
+
+TEST(UReportDocTitle, TheWindowTextReachesTheFirstViewOnlyAndOnlyAReportView)
+{
+    const FixedSurroundings surroundings;
+    const QString text = QStringLiteral("text");
+    UReportDoc report;
+    report.SetAutoDelete(false);
+    report.SetWindowTextW(text); // without a view there is nobody to tell
+    {
+        CViewPane plain;
+        CViewPane shows;
+        showIn<UView>(plain, report);
+        showIn<TestReportView>(shows, report);
+        report.SetWindowTextW(text);
+        EXPECT_EQ(plain.GetWindowTextW(), QString()) << "not a report view";
+        EXPECT_EQ(shows.GetWindowTextW(), QString()) << "not the first view";
+    }
+    {
+        CViewPane first;
+        CViewPane second;
+        showIn<TestReportView>(first, report);
+        showIn<TestReportView>(second, report);
+        report.SetWindowTextW(text);
+        EXPECT_EQ(first.GetWindowTextW(), text);
+        EXPECT_EQ(second.GetWindowTextW(), QString());
+        EXPECT_EQ(report.GetTitle(), QString()) << "the title stays";
+    }
+    TestReportView withoutPane;
+    report.AddView(&withoutPane);
+    report.SetWindowTextW(text);
+    EXPECT_EQ(report.GetFrameWindow(), nullptr);
+}
+
+TEST(UReportDocTitle, VisiblePanesAreNumberedFrom1AndAnOnlyOneHasNoNumber)
+{
+    struct Row
+    {
+        std::vector<int> views;    // the pane of each view
+        std::vector<bool> visible; // by pane
+        std::vector<int> expected; // by pane; 9 before
+        const char *reason;
+    };
+    const Row rows[] = {
+        {{0}, {true}, {0}, "an only pane"},
+        {{0}, {false}, {9}, "a hidden pane is not looked at"},
+        {{0, 1}, {true, true}, {1, 2}, "two panes in the order of their views"},
+        {{1, 0}, {true, true}, {2, 1}, "two panes in the order of their views"},
+        {{0, 1}, {true, false}, {0, 9}, "one of two can be seen"},
+        {{0, 1}, {false, true}, {9, 0}, "one of two can be seen"},
+        {{0, 0}, {true}, {0}, "two views in one pane"},
+        {{0, 1, 0, 2}, {true, true, true}, {1, 2, 3}, "a pane counts once"},
+        {{2, 1, 0}, {true, false, true}, {2, 9, 1}, "the hidden one takes no number"},
+        {{}, {true}, {9}, "a pane of another document"},
+    };
+    for (const Row &row : rows) {
+        const FixedSurroundings surroundings;
+        UReportDoc report;
+        report.SetAutoDelete(false);
+        CountingPane panes[3];
+        for (const int pane : row.views) {
+            showIn<TestReportView>(panes[pane], report);
+        }
+        for (std::size_t i = 0; i < row.visible.size(); ++i) {
+            panes[i].ShowPane(row.visible[i]);
+            panes[i].SetWindowNumber(9);
+            panes[i].titleUpdates = 0;
+        }
+        report.UpdateFrameCounts();
+        for (std::size_t i = 0; i < row.expected.size(); ++i) {
+            EXPECT_EQ(panes[i].GetWindowNumber(), row.expected[i]) << row.reason << ", pane " << i;
+            EXPECT_EQ(panes[i].titleUpdates, row.expected[i] == 9 ? 0 : 1) << row.reason << ", pane " << i;
+        }
+    }
+}
+
+TEST(UReportDocTitle, ActivatingOpensANewPaneAndUpdatesAllViews)
+{
+    const FixedSurroundings surroundings;
+    UReportDoc alone;
+    alone.Activate(true); // no application: no pane, and nothing to update
+    EXPECT_TRUE(alone.GetViews().empty());
+
+    ReportApplication application;
+    UReportDoc *report = application.create(QStringLiteral("N"));
+    ASSERT_EQ(report->GetViews().size(), 1U);
+    auto *first = static_cast<TestReportView *>(report->GetViews().front());
+    for (const bool reserved : {false, true}) {
+        first->updates = 0;
+        report->Activate(reserved);
+        EXPECT_EQ(first->updates, 1) << reserved;
+    }
+    ASSERT_EQ(report->GetViews().size(), 3U);
+    for (std::size_t i = 0; i < 3; ++i) {
+        EXPECT_TRUE(report->GetViews()[i]->IsVisible());
+        EXPECT_EQ(report->GetViews()[i]->GetParentPane()->GetWindowNumber(), static_cast<int>(i + 1));
+    }
+    EXPECT_EQ(static_cast<TestReportView *>(report->GetViews()[2])->updates, 2) << "shown first, then updated with all";
+}
+
+} // namespace

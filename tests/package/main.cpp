@@ -1,0 +1,25 @@
+#include <ReportEntry.h>
+#include <UApplication.h>
+#include <UReportDoc.h>
+
+#include <DefaultPrinter.h>
+#include <Profile.h>
+
+#include <cstdio>
+
+/// A host of one function: it makes a report and asks whether its text is there.
+int main()
+{
+    kareport::setProfileStore(kareport::makeMemoryProfile());
+    kareport::setDefaultPrinter({kareport::PrinterSource::None});
+    UApplication application;
+    application.AddDocTemplate(ReportInitialTemplate());
+    UReportDoc *report = CreateReport(QStringLiteral("Traverse"), true, false, nullptr, 0, nullptr);
+    if (report == nullptr) {
+        return 1;
+    }
+    report->WriteLine(QStringLiteral("Closed on point 1"), 0, 1, 0);
+    const QString text = report->GetText().toString();
+    std::puts(qUtf8Printable(text));
+    return text.startsWith(u"TALVEN - Traverse") && text.contains(u"Closed on point 1\r\n") ? 0 : 1;
+}
