@@ -11,22 +11,11 @@ namespace kareport
 
 namespace
 {
+
 constexpr qsizetype pieceSize = 64 * 1024;
-}
 
-bool replaceFile(const QString &path, const std::function<bool(QIODevice &)> &write, QString *error)
-{
-    // A link stays a link: what it points to is replaced.
-    const QFileInfo info(path);
-    QSaveFile file(info.isSymLink() && info.exists() ? info.canonicalFilePath() : path);
-    const bool done = file.open(QIODevice::WriteOnly) && write(file) && file.commit();
-    if (!done && error != nullptr) {
-        *error = file.errorString();
-    }
-    return done;
-}
-
-bool writeReportText(QIODevice &device, QStringView text, LineEnds lineEnds)
+template <typename Text>
+bool writePieces(QIODevice &device, Text text, LineEnds lineEnds)
 {
     if (lineEnds == LineEnds::ReportFile &&
         device.write(reportFileMark, sizeof reportFileMark) != qint64(sizeof reportFileMark))
@@ -44,6 +33,30 @@ bool writeReportText(QIODevice &device, QStringView text, LineEnds lineEnds)
         }
     }
     return true;
+}
+
+} // namespace
+
+bool replaceFile(const QString &path, const std::function<bool(QIODevice &)> &write, QString *error)
+{
+    // A link stays a link: what it points to is replaced.
+    const QFileInfo info(path);
+    QSaveFile file(info.isSymLink() && info.exists() ? info.canonicalFilePath() : path);
+    const bool done = file.open(QIODevice::WriteOnly) && write(file) && file.commit();
+    if (!done && error != nullptr) {
+        *error = file.errorString();
+    }
+    return done;
+}
+
+bool writeReportText(QIODevice &device, QStringView text, LineEnds lineEnds)
+{
+    return writePieces(device, text, lineEnds);
+}
+
+bool writeReportText(QIODevice &device, QLatin1StringView text, LineEnds lineEnds)
+{
+    return writePieces(device, text, lineEnds);
 }
 
 } // namespace kareport

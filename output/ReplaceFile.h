@@ -22,5 +22,6 @@ KAREPORT_EXPORT bool replaceFile(const QString &path, const std::function<bool(Q
 
 /// Writes report text to an open device, a piece at a time. @return false as soon as a write fails
 KAREPORT_EXPORT bool writeReportText(QIODevice &device, QStringView text, LineEnds lineEnds);
+KAREPORT_EXPORT bool writeReportText(QIODevice &device, QLatin1StringView text, LineEnds lineEnds);
 
 } // namespace kareport

@@ -14,15 +14,15 @@ namespace
 /// Characters looked at together. A fixed count lets the compiler use vector instructions.
 constexpr std::size_t runLength = 16;
 
-/// Whether a run holds only characters that are written as one byte of the same value.
-template <typename IsSpecial>
-bool isPlainRun(const char16_t *run, IsSpecial isSpecial)
+/// Whether a run holds only characters that are written as one byte of the same value, and none that is `special`.
+template <typename Character>
+bool isPlainRun(const Character *run, Character special)
 {
-    unsigned special = 0;
+    Character found = 0;
     for (std::size_t i = 0; i < runLength; ++i) {
-        special |= static_cast<unsigned>(run[i] > 0x7F) | static_cast<unsigned>(isSpecial(run[i]));
+        found = static_cast<Character>(found | (run[i] > 0x7F) | (run[i] == special));
     }
-    return special == 0;
+    return found == 0;
 }
 
 char *writeCharacter(char *out, char32_t character)
@@ -50,9 +50,19 @@ char *writeCharacter(char *out, char32_t character)
 
 std::size_t ReportTextEncoder::encode(QStringView text, char *out, bool last)
 {
+    return encodeCharacters(text.utf16(), text.utf16() + text.size(), out, last);
+}
+
+std::size_t ReportTextEncoder::encode(QLatin1StringView text, char *out, bool last)
+{
+    const auto *bytes = reinterpret_cast<const unsigned char *>(text.data());
+    return encodeCharacters(bytes, bytes + text.size(), out, last);
+}
+
+template <typename Character>
+std::size_t ReportTextEncoder::encodeCharacters(const Character *at, const Character *end, char *out, bool last)
+{
     const bool reportFile = lineEnds_ == LineEnds::ReportFile;
-    const char16_t *at = text.utf16();
-    const char16_t *const end = at + text.size();
     char *const begin = out;
 
     // What was held back is settled by the first character of this piece.
@@ -78,21 +88,26 @@ std::size_t ReportTextEncoder::encode(QStringView text, char *out, bool last)
         }
     }
 
+    const auto special = static_cast<Character>(reportFile ? u'\n' : u'\r');
     while (at != end) {
-        while (static_cast<std::size_t>(end - at) >= runLength &&
-               (reportFile ? isPlainRun(at, [](char16_t c) { return c == u'\n'; })
-                           : isPlainRun(at, [](char16_t c) { return c == u'\r'; })))
-        {
+        while (static_cast<std::size_t>(end - at) >= runLength && isPlainRun(at, special)) {
             for (std::size_t i = 0; i < runLength; ++i) {
                 out[i] = static_cast<char>(at[i]);
             }
             out += runLength;
             at += runLength;
         }
-        for (std::size_t i = 0; i < runLength && at != end; ++i) {
+        // Up to and with the character that is not plain; behind it whole runs are tried again.
+        while (at != end) {
             const char16_t character = *at++;
-            const bool holdsBack = QChar::isHighSurrogate(character) || (!reportFile && character == u'\r');
-            if (holdsBack) {
+            if (character < 0x80 && character != special) {
+                *out++ = static_cast<char>(character);
+                continue;
+            }
+            if (character == u'\n') {
+                *out++ = '\r';
+                *out++ = '\n';
+            } else if (character == u'\r' || QChar::isHighSurrogate(character)) {
                 heldBack_ = character;
                 if (at == end && !last) {
                     break;
@@ -100,14 +115,12 @@ std::size_t ReportTextEncoder::encode(QStringView text, char *out, bool last)
                 if (settle(at != end ? *at : u'\0', at != end)) {
                     ++at;
                 }
-            } else if (character == u'\n' && reportFile) {
-                *out++ = '\r';
-                *out++ = '\n';
             } else if (QChar::isLowSurrogate(character)) {
                 out = writeCharacter(out, QChar::ReplacementCharacter);
             } else {
                 out = writeCharacter(out, character);
             }
+            break;
         }
     }
     return static_cast<std::size_t>(out - begin);

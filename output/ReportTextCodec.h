@@ -2,6 +2,7 @@
 
 #include "KaReportExport.h"
 
+#include <QLatin1StringView>
 #include <QStringView>
 
 #include <cstddef>
@@ -29,8 +30,12 @@ public:
     /// @param last  the text ends here; otherwise a last CR or high surrogate is held back for the next piece
     /// @return the bytes written. A surrogate without its other half becomes U+FFFD.
     std::size_t encode(QStringView text, char *out, bool last);
+    std::size_t encode(QLatin1StringView text, char *out, bool last);
 
 private:
+    template <typename Character>
+    std::size_t encodeCharacters(const Character *at, const Character *end, char *out, bool last);
+
     LineEnds lineEnds_;
     char16_t heldBack_ = 0;
 };

@@ -1,7 +1,5 @@
 #include "PageWriter.h"
 
-#include <algorithm>
-
 namespace kareport
 {
 
@@ -10,7 +8,8 @@ namespace
 
 int countLineFeeds(QStringView text)
 {
-    return static_cast<int>(std::count(text.utf16(), text.utf16() + text.size(), u'\n'));
+    // Most pieces hold none, which is found faster than a number.
+    return text.contains(u'\n') ? static_cast<int>(text.count(u'\n')) : 0;
 }
 
 } // namespace

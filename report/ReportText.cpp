@@ -1,90 +1,115 @@
 #include "ReportText.h"
 
 #include <algorithm>
-#include <cstdlib>
 #include <new>
 
 namespace kareport
 {
 
-ReportText::ReportText(Reallocate reallocate) : reallocate_(reallocate != nullptr ? reallocate : std::realloc)
+namespace
 {
-    if (!grow(1)) {
+
+bool isLatin1(QStringView text)
+{
+    unsigned all = 0;
+    for (const char16_t *at = text.utf16(), *end = at + text.size(); at != end; ++at) {
+        all |= *at;
+    }
+    return all <= 0xFF;
+}
+
+} // namespace
+
+ReportText::ReportText(Reallocate reallocate)
+    : narrow_(reallocate != nullptr ? reallocate : std::realloc),
+      wide_(reallocate != nullptr ? reallocate : std::realloc)
+{
+    if (!narrow_.reserve(1)) {
         throw std::bad_alloc();
     }
 }
 
-ReportText::~ReportText()
+const char16_t *ReportText::data() const
 {
-    std::free(data_);
+    return widen() ? wide_.data() : u"";
 }
 
-bool ReportText::allocate(qint64 characters)
+QStringView ReportText::view() const
 {
-    const auto bytes = static_cast<std::size_t>(characters + 1) * sizeof(char16_t);
-    void *memory = reallocate_(data_, bytes);
-    if (memory == nullptr) {
-        return false;
-    }
-    data_ = static_cast<char16_t *>(memory);
-    allocated_ = characters;
-    return true;
+    return widen() ? QStringView(wide_.data(), wide_.size()) : QStringView(u"");
 }
 
-bool ReportText::grow(qint64 characters)
+QLatin1StringView ReportText::narrowView() const
 {
-    if (characters > longest) {
+    return {reinterpret_cast<const char *>(narrow_.data()), isNarrow_ ? narrow_.size() : 0};
+}
+
+bool ReportText::widen() const
+{
+    if (!isNarrow_) {
+        return true;
+    }
+    if (!wide_.reserve(std::max<qint64>(narrow_.size(), 1))) {
         return false;
     }
-    const qint64 counted = (characters + blockSize - 1) / blockSize * blockSize;
-    // With little memory left, what is asked for is enough.
-    if (counted > allocated_ && !allocate(std::max(counted, allocated_ * 2)) && !allocate(counted)) {
-        return false;
-    }
-    const qint64 firstNew = data_ == nullptr || usable_ == 0 ? 0 : usable_ + 1;
-    std::fill(data_ + firstNew, data_ + counted + 1, u'\0');
-    usable_ = counted;
+    std::copy_n(narrow_.data(), narrow_.size(), wide_.data());
+    wide_.setSize(narrow_.size());
+    narrow_.clear(false);
+    isNarrow_ = false;
     return true;
 }
 
 bool ReportText::append(QStringView text)
 {
-    if (!reserve(size_ + text.size())) {
+    if (size() + text.size() > longest || (isNarrow_ && !isLatin1(text) && !widen())) {
         return false;
     }
-    std::copy_n(text.utf16(), text.size(), data_ + size_);
-    size_ += text.size();
-    data_[size_] = u'\0';
+    if (!reserve(size() + text.size())) {
+        return false;
+    }
+    if (isNarrow_) {
+        std::transform(text.utf16(), text.utf16() + text.size(), narrow_.data() + narrow_.size(),
+                       [](char16_t character) { return static_cast<unsigned char>(character); });
+        narrow_.setSize(narrow_.size() + text.size());
+    } else {
+        std::copy_n(text.utf16(), text.size(), wide_.data() + wide_.size());
+        wide_.setSize(wide_.size() + text.size());
+    }
     return true;
 }
 
 bool ReportText::appendLineEnd()
 {
-    if (!reserve(size_ + 3)) {
+    const qint64 end = size();
+    if (!reserve(end + 3)) {
         return false;
     }
-    data_[size_++] = u'\r';
-    data_[size_++] = u'\n';
-    data_[size_] = u'\0';
+    if (isNarrow_) {
+        narrow_.data()[end] = '\r';
+        narrow_.data()[end + 1] = '\n';
+        narrow_.setSize(end + 2);
+    } else {
+        wide_.data()[end] = u'\r';
+        wide_.data()[end + 1] = u'\n';
+        wide_.setSize(end + 2);
+    }
     return true;
 }
 
 bool ReportText::assign(QStringView text)
 {
-    size_ = 0;
-    data_[0] = u'\0';
+    (isNarrow_ ? narrow_.setSize(0) : wide_.setSize(0));
     return append(text);
 }
 
 void ReportText::clear()
 {
-    size_ = 0;
-    usable_ = 0;
-    // A smaller block always fits; where the system would not shrink it, the larger one stays.
-    if (allocated_ > blockSize) {
-        allocate(blockSize);
+    // The narrow block comes first, so that there is a block also when no other can be had.
+    if (!isNarrow_ && narrow_.reserve(1)) {
+        wide_.clear(false);
+        isNarrow_ = true;
     }
-    grow(1);
+    (isNarrow_ ? narrow_.clear(true) : wide_.clear(true));
 }
 
 } // namespace kareport

@@ -1,7 +1,9 @@
 #pragma once
 
+#include "CharacterBlocks.h"
 #include "KaReportExport.h"
 
+#include <QLatin1StringView>
 #include <QStringView>
 
 #include <cstddef>
@@ -9,33 +11,36 @@
 namespace kareport
 {
 
-/// The text of a report: one growing run of UTF-16 characters, ended by a 0 character.
+/// The text of a report: one growing run of characters, ended by a 0.
 ///
-/// The capacity is counted in blocks and zeroed block by block; the memory behind it grows geometrically, so that a text
-/// of any length is copied a constant number of times.
+/// Most reports hold no character above U+00FF. Such a text is kept with one byte a character, which halves the memory of
+/// long reports, until somebody asks for it in UTF-16 or writes another character.
 class KAREPORT_EXPORT ReportText
 {
 public:
     /// What memory is got with: `realloc`, or a test's own.
-    using Reallocate = void *(*)(void *memory, std::size_t bytes);
+    using Reallocate = CharacterBlocks<char16_t>::Reallocate;
 
-    static constexpr qint64 blockSize = 32000;    ///< characters in a block
-    static constexpr qint64 longest = 0x7FFFFFFF; ///< characters in a text at most
+    static constexpr qint64 blockSize = CharacterBlocks<char16_t>::blockSize;
+    static constexpr qint64 longest = CharacterBlocks<char16_t>::longest;
 
     /// One block, empty. @throws std::bad_alloc when there is no memory for it
     explicit ReportText(Reallocate reallocate = nullptr);
-    ~ReportText();
-    ReportText(const ReportText &) = delete;
-    ReportText &operator=(const ReportText &) = delete;
 
-    /// The characters, with a 0 behind the last; valid until the next change.
-    const char16_t *data() const { return data_; }
-    qint64 size() const { return size_; }
-    QStringView view() const { return {data_, size_}; }
+    /// The characters in UTF-16, with a 0 behind the last; valid until the next change. A text that cannot be had in
+    /// UTF-16 for want of memory shows as an empty one; `size` still says its length.
+    const char16_t *data() const;
+    qint64 size() const { return isNarrow_ ? narrow_.size() : wide_.size(); }
+    bool isEmpty() const { return size() == 0; }
+    QStringView view() const;
+
+    /// Whether the text is kept with one byte a character: `narrowView` then shows it as it is.
+    bool isNarrow() const { return isNarrow_; }
+    QLatin1StringView narrowView() const;
 
     /// Makes room for so many characters and the 0 behind them. @return false when there is no memory for them or they
     /// are more than `longest`; the text stays as it is
-    bool reserve(qint64 characters) { return characters <= usable_ || grow(characters); }
+    bool reserve(qint64 characters) { return isNarrow_ ? narrow_.reserve(characters) : wide_.reserve(characters); }
 
     /// Appends a text. @return false, changing nothing, when there is no room
     bool append(QStringView text);
@@ -47,14 +52,12 @@ public:
     void clear();
 
 private:
-    bool grow(qint64 characters);
-    bool allocate(qint64 characters);
+    bool widen() const;
 
-    Reallocate reallocate_;
-    char16_t *data_ = nullptr;
-    qint64 size_ = 0;
-    qint64 usable_ = 0;    ///< characters that fit into the counted blocks, all of them allocated and zeroed
-    qint64 allocated_ = 0; ///< characters that fit into the memory
+    // How the text is kept is nothing that a reader sees, so it changes in a const text as well.
+    mutable CharacterBlocks<unsigned char> narrow_;
+    mutable CharacterBlocks<char16_t> wide_;
+    mutable bool isNarrow_ = true;
 };
 
 } // namespace kareport

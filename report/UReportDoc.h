@@ -3,6 +3,7 @@
 #include "KaReportExport.h"
 #include "PageMeasurement.h"
 #include "PageWriter.h"
+#include "ReportTextCodec.h"
 #include "UDataObjectList.h"
 #include "UDocument.h"
 #include "UJobSettings.h"
@@ -19,6 +20,7 @@
 #include <optional>
 
 class CViewPane;
+class QIODevice;
 
 namespace kareport
 {
@@ -50,6 +52,9 @@ public:
     const char16_t *GetData() const { return page_.text().data(); }
     /// The same with its length, for texts that hold a character 0.
     QStringView GetText() const { return page_.text().view(); }
+    bool IsEmpty() const { return page_.text().isEmpty(); }
+    /// Writes the text to an open device, in UTF-8. @return false as soon as a write fails
+    bool WriteText(QIODevice &device, kareport::LineEnds lineEnds) const;
     /// Replaces the text as it is. Counters stay, so what is written next continues the old pages.
     void SetData(const QString &text);
     /// Empties the report. The next line written begins page 1.

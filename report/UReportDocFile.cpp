@@ -2,12 +2,18 @@
 
 #include "ReplaceFile.h"
 
+bool UReportDoc::WriteText(QIODevice &device, kareport::LineEnds lineEnds) const
+{
+    const kareport::ReportText &text = page_.text();
+    return text.isNarrow() ? kareport::writeReportText(device, text.narrowView(), lineEnds)
+                           : kareport::writeReportText(device, text.view(), lineEnds);
+}
+
 bool UReportDoc::OnSaveDocument(const QString &path)
 {
-    const QStringView text = GetText();
     // An empty report is saved by doing nothing: no file is made and none is emptied.
-    if (!text.isEmpty() && !kareport::replaceFile(path, [text](QIODevice &device) {
-            return kareport::writeReportText(device, text, kareport::LineEnds::ReportFile);
+    if (!IsEmpty() && !kareport::replaceFile(path, [this](QIODevice &device) {
+            return WriteText(device, kareport::LineEnds::ReportFile);
         }))
     {
         return false;

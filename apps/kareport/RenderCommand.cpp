@@ -63,7 +63,7 @@ ExitStatus writeOutputs(UReportDoc &report, const Job &job, Progress &progress, 
         if (error) {
             printError(QStringLiteral("kareport: ") + *error);
             status = exitOutput;
-        } else if (!quiet && report.GetText().isEmpty() && output.kind == OutputKind::Report) {
+        } else if (!quiet && report.IsEmpty() && output.kind == OutputKind::Report) {
             printError(Xlate("kareport: the report is empty: \"%1\" was not written").arg(output.file));
         }
     }
@@ -121,6 +121,12 @@ ExitStatus RenderCommand::run(int &argc, char **argv) const
         readyJob.outputs.push_back({QStringLiteral("-"), as.isEmpty() ? OutputKind::Text : *outputKindFromName(as)});
     }
 
+    // What Qt has to say about its surroundings (no session, no screen) is nothing to a person who renders a report.
+    qInstallMessageHandler([](QtMsgType type, const QMessageLogContext &, const QString &text) {
+        if (type == QtCriticalMsg || type == QtFatalMsg) {
+            printError(QStringLiteral("kareport: ") + text);
+        }
+    });
     // Fonts need an application with a platform, but no screen. Most jobs need neither.
     std::unique_ptr<QCoreApplication> application;
     if (JobRunner::needsFonts(readyJob)) {

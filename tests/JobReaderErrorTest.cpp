@@ -1,0 +1,243 @@
+#include "JobReader.h"
+
+#include "JobFolder.h"
+
+#include <gtest/gtest.h>
+
+namespace
+{
+
+using kareport::errorOf;
+using kareport::JsonSource;
+
+/// A job with one mistake, which "@" stands before.
+struct Row
+{
+    const char *job;
+    const char *contains; ///< what the message says was expected, or names
+    const char *reason;
+};
+
+template <std::size_t count>
+void expectErrors(const Row (&rows)[count])
+{
+    for (const Row &row : rows) {
+        const MarkedText marked(row.job);
+        auto read = JsonSource::fromBytes(QStringLiteral("job.json"), marked.text);
+        ASSERT_EQ(errorOf(read), nullptr) << row.job;
+        auto &source = std::get<JsonSource>(read);
+        kareport::readJob(source);
+        ASSERT_TRUE(source.failed()) << row.reason << ": " << row.job;
+        const QString message = source.error()->message();
+        EXPECT_TRUE(message.startsWith(QStringLiteral("job.json:%1: error: ").arg(marked.place)))
+            << row.reason << ": " << row.job << "\n" << message.toStdString();
+        EXPECT_TRUE(source.error()->text.contains(QString::fromUtf8(row.contains)))
+            << row.reason << ": " << row.job << "\n" << message.toStdString();
+        EXPECT_FALSE(message.contains(u'\n')) << row.reason;
+    }
+}
+
+TEST(JobReaderError, OfTheJobItself)
+{
+    constexpr Row rows[] = {
+        {R"(@{})", "\"report\"", "the one key that must be there"},
+        {R"(@{"title": "T"})", "\"report\"", "where nothing else is wrong"},
+        {R"({"report": @{}})", "a list was expected", "steps in an object"},
+        {R"({"report": @null})", "a list was expected", "null is no list"},
+        {R"({"report": [], @"reports": []})", "\"reports\"", "an unknown key is named"},
+        {R"({"report": [], @"Title": "T"})", "\"Title\"", "case matters in keys"},
+        {R"({"report": [], "title": @5})", "a text was expected", "wrong type"},
+        {R"({"report": [], "title": @null})", "a text was expected", "null is no text"},
+        {R"({"report": [], "application": @5})", "a text was expected", "wrong type"},
+        {R"({"report": [], "application": @"Survey"})", "TALVEN", "the application's name must begin the title"},
+        {R"({"report": [], "header": @"yes"})", "true or false was expected", "wrong type"},
+        {R"({"report": [], "header": @1})", "true or false was expected", "wrong type"},
+        {R"({"report": [], "now": @5})", "a text was expected", "wrong type"},
+        {R"({"report": [], "now": @"yesterday"})", "2024-03-05T14:07:00", "no time"},
+        {R"({"report": [], "now": @"2024-02-30T00:00:00"})", "2024-03-05T14:07:00", "no such day"},
+        {R"({"report": [], "now": @""})", "2024-03-05T14:07:00", "an empty text"},
+        {"{\"report\": [],\r\n  \"title\": \"Gr\xC3\xB6\xC3\x9F" "e \xF0\x9D\x84\x9E\", \"header\": @0}",
+         "true or false was expected", "columns count characters"},
+        {"\xEF\xBB\xBF{\"report\": [], \"header\": @0}", "true or false was expected", "behind a byte-order mark"},
+    };
+    expectErrors(rows);
+}
+
+TEST(JobReaderError, OfThePage)
+{
+    constexpr Row rows[] = {
+        {R"({"report": [], "page": @[]})", "an object was expected", "wrong type"},
+        {R"({"report": [], "page": {@"lines": 72}})", "\"lines\"", "unknown key"},
+        {R"({"report": [], "page": {"paper": @"B5"}})", "A4", "no such paper"},
+        {R"({"report": [], "page": {"paper": @4}})", "a text was expected", "wrong type"},
+        {R"({"report": [], "page": {"orientation": @"upright"}})", "portrait, landscape", "no such orientation"},
+        {R"({"report": [], "page": {"orientation": @true}})", "a text was expected", "wrong type"},
+        {R"({"report": [], "page": {"resolution": @0}})", "a whole number from 1", "no dots"},
+        {R"({"report": [], "page": {"resolution": @600.5}})", "a whole number", "not whole"},
+        {R"({"report": [], "page": {"resolution": @"600"}})", "a whole number", "wrong type"},
+        {R"({"report": [], "page": {"margins": @1000}})", "four margins", "wrong type"},
+        {R"({"report": [], "page": {"margins": @[1, 2, 3]}})", "four margins", "one is missing"},
+        {R"({"report": [], "page": {"margins": @[1, 2, 3, 4, 5]}})", "four margins", "one too many"},
+        {R"({"report": [], "page": {"margins": [1, 2, @"3", 4]}})", "a whole number", "wrong type inside"},
+        {R"({"report": [], "page": {"margins": [1, 2, 3, @0.5]}})", "a whole number", "not whole"},
+        {R"({"report": [], "page": {"fontName": @5}})", "a text was expected", "wrong type"},
+        {R"({"report": [], "page": {"fontSize": @0}})", "a whole number from 1", "no size"},
+        {R"({"report": [], "page": {"fontSize": @"8"}})", "a whole number", "wrong type"},
+        {R"({"report": [], "page": {"linesPerPage": @0}})", "a whole number from 1", "less than 1"},
+        {R"({"report": [], "page": {"linesPerPage": @-72}})", "a whole number from 1", "negative"},
+        {R"({"report": [], "page": {"linesPerPage": @1e300}})", "a whole number from 1", "beyond a page"},
+        {R"({"report": [], "page": {"linesPerPage": @"72"}})", "a whole number", "wrong type"},
+        {R"({"report": [], "page": {"charsPerRow": @0}})", "a whole number from 1", "less than 1"},
+        {R"({"report": [], "page": {"printer": @"laser"}})", "default", "no such printer"},
+        {R"({"report": [], "page": {"printer": @true}})", "a text was expected", "wrong type"},
+    };
+    expectErrors(rows);
+}
+
+TEST(JobReaderError, OfTheSettings)
+{
+    constexpr Row rows[] = {
+        {R"({"report": [], "settings": @5})", "an object was expected", "wrong type"},
+        {R"({"report": [], "settings": {@"lenghtUnit": "m"}})", "\"lenghtUnit\"", "unknown key"},
+        {R"({"report": [], "settings": {"lengthUnit": @"yd"}})", "m, mm, km, ft, usft", "no such unit"},
+        {R"({"report": [], "settings": {"lengthUnit": @"M"}})", "m, mm, km, ft, usft", "case matters"},
+        {R"({"report": [], "settings": {"lengthUnit": @1}})", "a text was expected", "wrong type"},
+        {R"({"report": [], "settings": {"areaUnit": @"m"}})", "m2, ha, km2, ft2, ac", "a unit of length"},
+        {R"({"report": [], "settings": {"angleUnit": @"dms"}})", "deg, gon, rad", "a unit of data only"},
+        {R"({"report": [], "settings": {"lengthDecimals": @16}})", "from 0 to 15", "too many"},
+        {R"({"report": [], "settings": {"lengthDecimals": @-1}})", "from 0 to 15", "negative"},
+        {R"({"report": [], "settings": {"lengthDecimals": @2.5}})", "from 0 to 15", "not whole"},
+        {R"({"report": [], "settings": {"stationDecimals": @16}})", "from 0 to 15", "too many"},
+        {R"({"report": [], "settings": {"numberDecimals": @"3"}})", "from 0 to 15", "wrong type"},
+        {R"({"report": [], "settings": {"stationFormat": @"0+0"}})", "plain, 0+00, 0+000", "no such format"},
+        {R"({"report": [], "settings": {"northEastOrder": @"NW"}})", "NE, EN", "no such order"},
+        {R"({"report": [], "settings": {"bearingUnit": @"rad"}})", "dms, deg, gon", "no such unit"},
+        {R"({"report": [], "settings": {"bearingStyle": @"round"}})", "quadrant, circle", "no such style"},
+        {R"({"report": [], "settings": {"bearingDecimals": @10}})", "from 0 to 9", "too many"},
+        {R"({"report": [], "settings": {"bearingPadding": @1}})", "true or false was expected", "wrong type"},
+        {R"({"report": [], "settings": {"bearingReference": @"east"}})", "north, south", "no such reference"},
+        {R"({"report": [], "settings": {"angleMarks": @"d"}})", "a list of three texts", "wrong type"},
+        {R"({"report": [], "settings": {"angleMarks": @["d"]}})", "a list of three texts", "two are missing"},
+        {R"({"report": [], "settings": {"angleMarks": ["d", @1, ""]}})", "a text was expected", "wrong type inside"},
+        {R"({"report": [], "settings": {"angleMarks": ["d", "m", @"''"]}})", "one character", "two characters"},
+        {"{\"report\": [], \"settings\": {\"angleMarks\": [@\"\xE2\x82\xAC\", \"m\", \"s\"]}}", "up to 255",
+         "a character beyond Latin-1"},
+    };
+    expectErrors(rows);
+}
+
+TEST(JobReaderError, OfTemplateAndOptions)
+{
+    constexpr Row rows[] = {
+        {R"({"report": [], "template": @"t.xml"})", "an object was expected", "wrong type"},
+        {R"({"report": [], "template": @{"file": "t.xml"}})", "\"name\"", "no name"},
+        {R"({"report": [], "template": @{"name": "T"}})", "\"file\"", "no file"},
+        {R"({"report": [], "template": {"file": @5, "name": "T"}})", "a text was expected", "wrong type"},
+        {R"({"report": [], "template": {"file": "t.xml", "name": "T", @"table": "P"}})", "\"table\"", "unknown key"},
+        {R"({"report": [], "options": @[]})", "an object was expected", "wrong type"},
+        {R"({"report": [], "options": {@"blankZero": true}})", "\"blankZero\"", "unknown key"},
+        {R"({"report": [], "options": {"zeroBlank": @1}})", "true or false was expected", "wrong type"},
+        {R"({"report": [], "options": {"writeTableName": @"x"}})", "true or false was expected", "wrong type"},
+        {R"({"report": [], "options": {"printHash": @null}})", "true or false was expected", "null is not false"},
+        {R"({"report": [], "options": {"excel": @"true"}})", "true or false was expected", "wrong type"},
+        {R"({"report": [], "options": {"chainageLabel": @5}})", "a text was expected", "wrong type"},
+        {R"({"report": [], "options": {"separator": @""}})", "one character", "no character"},
+        {R"({"report": [], "options": {"separator": @"ab"}})", "one character", "two characters"},
+        {R"({"report": [], "options": {"separator": @-1}})", "a whole number from 0", "negative"},
+        {R"({"report": [], "options": {"separator": @65536}})", "a whole number from 0", "no 16-bit character"},
+        {R"({"report": [], "options": {"separator": @true}})", "a whole number", "wrong type"},
+    };
+    expectErrors(rows);
+}
+
+TEST(JobReaderError, OfData)
+{
+    constexpr Row rows[] = {
+        {R"({"report": [], "data": @[]})", "an object was expected", "wrong type"},
+        {R"({"report": [], "data": {"p": @"p.csv"}})", "an object was expected", "wrong type of a set"},
+        {R"({"report": [], "data": {"p": @{}}})", "either \"csv\" or \"values\"", "neither of the two"},
+        {R"({"report": [], "data": {"p": @{"csv": "p.csv", "values": []}}})", "either \"csv\" or \"values\"", "both"},
+        {R"({"report": [], "data": {"p": {"csv": "p.csv", @"separator": ";"}}})", "\"separator\"", "unknown key"},
+        {R"({"report": [], "data": {"p": {"csv": @5}}})", "a text was expected", "wrong type"},
+        {R"({"report": [], "data": {"p": {"values": @5}}})", "an object or a list of objects", "wrong type"},
+        {R"({"report": [], "data": {"p": {"values": @null}}})", "an object or a list of objects", "null"},
+        {R"({"report": [], "data": {"p": {"csv": "p.csv", "delimiter": @""}}})", "one ASCII character", "none"},
+        {R"({"report": [], "data": {"p": {"csv": "p.csv", "delimiter": @"||"}}})", "one ASCII character", "two"},
+        {R"({"report": [], "data": {"p": {"csv": "p.csv", "delimiter": @"\""}}})", "quote", "a quote"},
+        {R"({"report": [], "data": {"p": {"csv": "p.csv", "delimiter": @"\n"}}})", "line end", "a line end"},
+        {R"({"report": [], "data": {"p": {"csv": "p.csv", "delimiter": @"\u0000"}}})", "ASCII character", "zero"},
+        {R"({"report": [], "data": {"p": {"csv": "p.csv", "delimiter": @"\u00a7"}}})", "ASCII", "more than a byte"},
+        {R"({"report": [], "data": {"p": {"csv": "p.csv", "delimiter": @9}}})", "a text was expected", "wrong type"},
+        {R"({"report": [], "data": {"p": {"values": [], "units": @"m"}}})", "an object was expected", "wrong type"},
+        {R"({"report": [], "data": {"p": {"values": [], "units": {@"lenght": "m"}}}})", "\"lenght\"", "unknown key"},
+        {R"({"report": [], "data": {"p": {"values": [], "units": {"length": @"yd"}}}})", "m, mm, km, ft, usft", "none"},
+        {R"({"report": [], "data": {"p": {"values": [], "units": {"area": @"m"}}}})", "m2, ha, km2, ft2, ac", "none"},
+        {R"({"report": [], "data": {"p": {"values": [], "units": {"angle": @"grad"}}}})", "deg, gon, rad, dms", "none"},
+        {R"({"report": [], "data": {"p": {"values": [], "units": {"angle": @5}}}})", "a text was expected", "type"},
+        {"{\"report\": [],\n \"data\": {\"a\": {\"values\": []},\n  \"b\": {\"values\": [],\n   @\"csw\": \"\"}}}",
+         "\"csw\"", "in the second set, lines below"},
+    };
+    expectErrors(rows);
+}
+
+#define KA_SETS R"("template": {"file": "t.xml", "name": "T"}, "data": {"d": {"values": []}}, )"
+
+TEST(JobReaderError, OfSteps)
+{
+    constexpr Row rows[] = {
+        {R"({"report": [@5]})", "an object was expected", "wrong type"},
+        {R"({"report": [@{}]})", "heading, line, lineFeed, newPage, block, table, clear", "a step of nothing"},
+        {R"({"report": [{@"headings": "H"}]})", "\"headings\"", "unknown step"},
+        {R"({"report": [{"line": "a"}, {"line": @5}]})", "a text was expected", "wrong type in the second step"},
+        {R"({"report": [{"heading": @5}]})", "a text was expected", "wrong type"},
+        {R"({"report": [{"heading": "H", @"style": 1}]})", "\"style\"", "a heading has no style"},
+        {R"({"report": [{"heading": "H", @"line": "L"}]})", "\"line\"", "two steps in one"},
+        {R"({"report": [{"heading": "H", "before": @"1"}]})", "a whole number", "wrong type"},
+        {R"({"report": [{"heading": "H", "after": @0.5}]})", "a whole number", "not whole"},
+        {R"({"report": [{"line": "L", "before": @true}]})", "a whole number", "wrong type"},
+        {R"({"report": [{"line": "L", "after": @null}]})", "a whole number", "null is no number"},
+        {R"({"report": [{"line": "L", "style": @"bold"}]})", "a whole number", "wrong type"},
+        {R"({"report": [{"line": "L", @"data": "d"}]})", "\"data\"", "a line has no data"},
+        {R"({"report": [{"lineFeed": @"1"}]})", "a whole number", "wrong type"},
+        {R"({"report": [{"lineFeed": 1, @"style": 1}]})", "\"style\"", "unknown key"},
+        {R"({"report": [{"newPage": @true}]})", "a whole number", "wrong type"},
+        {R"({"report": [{"clear": @1}]})", "true or false was expected", "wrong type"},
+        {R"({"report": [{"clear": @false}]})", "true was expected", "not to clear is no step"},
+        {"{" KA_SETS R"("report": [{"block": @5, "data": "d"}]})", "a text was expected", "wrong type"},
+        {"{" KA_SETS R"("report": [@{"block": "B"}]})", "\"data\"", "no data"},
+        {"{" KA_SETS R"("report": [{"block": "B", "data": @5}]})", "a text was expected", "wrong type"},
+        {"{" KA_SETS R"("report": [{"block": "B", "data": @"e"}]})", "\"e\"", "no such data"},
+        {"{" KA_SETS R"("report": [{"block": "B", "data": @"D"}]})", "\"D\"", "case matters in names of data"},
+        {"{" KA_SETS R"("report": [{"block": "B", "data": "d", @"headingAfter": 1}]})", "\"headingAfter\"", "unknown"},
+        {"{" KA_SETS R"("report": [@{"table": "P"}]})", "\"data\"", "no data"},
+        {"{" KA_SETS R"("report": [{"table": "P", "data": @"e"}]})", "\"e\"", "no such data"},
+        {"{" KA_SETS R"("report": [{"table": "P", "data": "d", "headingAfter": @"2"}]})", "a whole number", "type"},
+        {"{" KA_SETS R"("report": [{"table": "P", "data": "d", @"style": 1}]})", "\"style\"", "unknown key"},
+        {R"({"data": {"d": {"values": []}}, "report": [@{"table": "P", "data": "d"}]})", "\"template\"",
+         "a table without a template"},
+        {R"({"data": {"d": {"values": {}}}, "report": [@{"block": "B", "data": "d"}]})", "\"template\"",
+         "a block without a template"},
+    };
+    expectErrors(rows);
+}
+
+TEST(JobReaderError, OfOutputs)
+{
+    constexpr Row rows[] = {
+        {R"({"report": [], "output": @"a.rep"})", "a list was expected", "wrong type"},
+        {R"({"report": [], "output": ["a.rep", @5]})", "a text was expected", "wrong type inside"},
+        {R"({"report": [], "output": [@"a.doc"]})", "\"a.doc\"", "an ending of no kind"},
+        {R"({"report": [], "output": [@"rep"]})", "\"rep\"", "no ending"},
+        {R"({"report": [], "output": [@{}]})", "\"file\"", "no file"},
+        {R"({"report": [], "output": [@{"as": "rep"}]})", "\"file\"", "a kind, but no file"},
+        {R"({"report": [], "output": [{"file": @5, "as": "rep"}]})", "a text was expected", "wrong type"},
+        {R"({"report": [], "output": [{"file": @"a.bin"}]})", "\"as\"", "an ending of no kind"},
+        {R"({"report": [], "output": [{"file": "a.rep", "as": @"doc"}]})", "rep", "no such kind"},
+        {R"({"report": [], "output": [{"file": "a.rep", "as": @"REP"}]})", "rep", "case matters in kinds"},
+        {R"({"report": [], "output": [{"file": "a.rep", "as": @1}]})", "a text was expected", "wrong type"},
+        {R"({"report": [], "output": [{"file": "a.rep", @"kind": "rep"}]})", "\"kind\"", "unknown key"},
+    };
+    expectErrors(rows);
+}
+
+} // namespace

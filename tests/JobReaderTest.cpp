@@ -1,0 +1,289 @@
+#include "JobReader.h"
+
+#include "JobFolder.h"
+#include "OrientationOrder.h"
+
+#include <QDir>
+
+#include <gtest/gtest.h>
+
+namespace
+{
+
+using kareport::errorOf;
+using kareport::Job;
+using kareport::JsonSource;
+using kareport::OutputKind;
+
+const QString folder = QDir::rootPath() + QStringLiteral("jobs");
+
+JsonSource sourceOf(const QByteArray &json)
+{
+    auto read = JsonSource::fromBytes(folder + QStringLiteral("/job.json"), json);
+    EXPECT_EQ(errorOf(read), nullptr) << json.constData();
+    return std::get<JsonSource>(std::move(read));
+}
+
+Job jobOf(const QByteArray &json)
+{
+    JsonSource source = sourceOf(json);
+    Job job = readJob(source);
+    EXPECT_FALSE(source.failed()) << source.error()->message().toStdString();
+    return job;
+}
+
+TEST(JobReader, EveryKeyButReportIsOptional)
+{
+    const Job job = jobOf(R"({"report": []})");
+    EXPECT_EQ(job.folder, folder);
+    EXPECT_FALSE(job.title);
+    EXPECT_EQ(job.application, QStringLiteral("TALVEN"));
+    EXPECT_TRUE(job.header);
+    EXPECT_FALSE(job.now);
+    EXPECT_EQ(job.page.printer.source, kareport::PrinterSource::BuiltIn);
+    EXPECT_EQ(job.page.printer.paper, kareport::PaperSize::A4);
+    EXPECT_EQ(job.page.printer.resolution, 600);
+    EXPECT_TRUE(job.page.portrait);
+    EXPECT_FALSE(job.page.margins);
+    EXPECT_FALSE(job.page.fontName);
+    EXPECT_FALSE(job.page.fontSize);
+    EXPECT_FALSE(job.page.linesPerPage);
+    EXPECT_FALSE(job.page.charsPerRow);
+    EXPECT_FALSE(job.reportTemplate);
+    EXPECT_FALSE(job.options.zeroBlank);
+    EXPECT_FALSE(job.options.writeTableName);
+    EXPECT_FALSE(job.options.printHash);
+    EXPECT_FALSE(job.options.excel);
+    EXPECT_FALSE(job.options.chainageLabel);
+    EXPECT_FALSE(job.options.separator);
+    EXPECT_TRUE(job.data.isEmpty());
+    EXPECT_TRUE(job.steps.empty());
+    EXPECT_TRUE(job.outputs.empty());
+}
+
+TEST(JobReader, SettingsHaveTheHostsDefaults)
+{
+    for (const char *json : {R"({"report": []})", R"({"report": [], "settings": {}})"}) {
+        const UJobSettings settings = jobOf(json).settings;
+        EXPECT_EQ(settings.lengthUnit, kareport::LengthUnit::Metre);
+        EXPECT_EQ(settings.areaUnit, kareport::AreaUnit::SquareMetre);
+        EXPECT_EQ(settings.angleUnit, kareport::AngleUnit::Degree);
+        EXPECT_EQ(settings.lengthDecimals, 3);
+        EXPECT_EQ(settings.stationDecimals, 3);
+        EXPECT_EQ(settings.numberDecimals, 3);
+        EXPECT_EQ(settings.stationFormat, UJobSettings::StationFormat::ThousandsPlus);
+        EXPECT_EQ(settings.northEastOrder, ORDER_NORTHING_EASTING);
+        EXPECT_EQ(settings.bearingUnit, 0U) << "dms";
+        EXPECT_EQ(settings.bearingStyle, 1) << "quadrant";
+        EXPECT_EQ(settings.bearingDecimals, 0);
+        EXPECT_EQ(settings.bearingPadding, 1);
+        EXPECT_EQ(settings.bearingReference, 0U) << "north";
+        EXPECT_EQ(settings.angleMarks, (std::array<char, 3>{'\xB0', '\'', '"'}));
+    }
+}
+
+TEST(JobReader, ReadsEverySettingByItsKey)
+{
+    struct Row
+    {
+        const char *setting;
+        bool (*holds)(const UJobSettings &settings);
+    };
+    using S = const UJobSettings &;
+    constexpr Row rows[] = {
+        {R"("lengthUnit": "m")", [](S s) { return s.lengthUnit == kareport::LengthUnit::Metre; }},
+        {R"("lengthUnit": "mm")", [](S s) { return s.lengthUnit == kareport::LengthUnit::Millimetre; }},
+        {R"("lengthUnit": "km")", [](S s) { return s.lengthUnit == kareport::LengthUnit::Kilometre; }},
+        {R"("lengthUnit": "ft")", [](S s) { return s.lengthUnit == kareport::LengthUnit::InternationalFoot; }},
+        {R"("lengthUnit": "usft")", [](S s) { return s.lengthUnit == kareport::LengthUnit::UsSurveyFoot; }},
+        {R"("areaUnit": "m2")", [](S s) { return s.areaUnit == kareport::AreaUnit::SquareMetre; }},
+        {R"("areaUnit": "ha")", [](S s) { return s.areaUnit == kareport::AreaUnit::Hectare; }},
+        {R"("areaUnit": "km2")", [](S s) { return s.areaUnit == kareport::AreaUnit::SquareKilometre; }},
+        {R"("areaUnit": "ft2")", [](S s) { return s.areaUnit == kareport::AreaUnit::SquareFoot; }},
+        {R"("areaUnit": "ac")", [](S s) { return s.areaUnit == kareport::AreaUnit::Acre; }},
+        {R"("angleUnit": "deg")", [](S s) { return s.angleUnit == kareport::AngleUnit::Degree; }},
+        {R"("angleUnit": "gon")", [](S s) { return s.angleUnit == kareport::AngleUnit::Gon; }},
+        {R"("angleUnit": "rad")", [](S s) { return s.angleUnit == kareport::AngleUnit::Radian; }},
+        {R"("lengthDecimals": 0)", [](S s) { return s.lengthDecimals == 0; }},
+        {R"("lengthDecimals": 15)", [](S s) { return s.lengthDecimals == 15; }},
+        {R"("stationDecimals": 0)", [](S s) { return s.stationDecimals == 0; }},
+        {R"("stationDecimals": 15)", [](S s) { return s.stationDecimals == 15; }},
+        {R"("numberDecimals": 0)", [](S s) { return s.numberDecimals == 0; }},
+        {R"("numberDecimals": 15)", [](S s) { return s.numberDecimals == 15; }},
+        {R"("stationFormat": "plain")", [](S s) { return s.stationFormat == UJobSettings::StationFormat::Plain; }},
+        {R"("stationFormat": "0+00")",
+         [](S s) { return s.stationFormat == UJobSettings::StationFormat::HundredsPlus; }},
+        {R"("stationFormat": "0+000")",
+         [](S s) { return s.stationFormat == UJobSettings::StationFormat::ThousandsPlus; }},
+        {R"("northEastOrder": "NE")", [](S s) { return s.northEastOrder == ORDER_NORTHING_EASTING; }},
+        {R"("northEastOrder": "EN")", [](S s) { return s.northEastOrder == ORDER_EASTING_NORTHING; }},
+        {R"("bearingUnit": "dms")", [](S s) { return s.bearingUnit == 0; }},
+        {R"("bearingUnit": "deg")", [](S s) { return s.bearingUnit == 1; }},
+        {R"("bearingUnit": "gon")", [](S s) { return s.bearingUnit == 2; }},
+        {R"("bearingStyle": "circle")", [](S s) { return s.bearingStyle == 0; }},
+        {R"("bearingStyle": "quadrant")", [](S s) { return s.bearingStyle == 1; }},
+        {R"("bearingDecimals": 9)", [](S s) { return s.bearingDecimals == 9; }},
+        {R"("bearingPadding": false)", [](S s) { return s.bearingPadding == 0; }},
+        {R"("bearingPadding": true)", [](S s) { return s.bearingPadding == 1; }},
+        {R"("bearingReference": "north")", [](S s) { return s.bearingReference == 0; }},
+        {R"("bearingReference": "south")", [](S s) { return s.bearingReference == 1; }},
+        {R"("angleMarks": ["d", "m", ""])",
+         [](S s) { return s.angleMarks == std::array<char, 3>{'d', 'm', '\0'}; }},
+        {R"("angleMarks": ["\u00ff", "\u00b4", "-"])",
+         [](S s) { return s.angleMarks == std::array<char, 3>{'\xFF', '\xB4', '-'}; }},
+    };
+    for (const Row &row : rows) {
+        const QByteArray json = QByteArray(R"({"report": [], "settings": {)") + row.setting + "}}";
+        EXPECT_TRUE(row.holds(jobOf(json).settings)) << row.setting;
+    }
+}
+
+TEST(JobReader, ReadsEveryUnitOfADataSet)
+{
+    using U = const kareport::DataUnits &;
+    struct Row
+    {
+        const char *units;
+        bool (*holds)(const kareport::DataUnits &units);
+    };
+    constexpr Row rows[] = {
+        {"{}", [](U u) { return u.length == kareport::LengthUnit::Metre && u.area == kareport::AreaUnit::SquareMetre; }},
+        {"{}", [](U u) { return u.angle == kareport::AngleUnit::Degree && !u.sexagesimal; }},
+        {R"({"length": "m"})", [](U u) { return u.length == kareport::LengthUnit::Metre; }},
+        {R"({"length": "mm"})", [](U u) { return u.length == kareport::LengthUnit::Millimetre; }},
+        {R"({"length": "km"})", [](U u) { return u.length == kareport::LengthUnit::Kilometre; }},
+        {R"({"length": "ft"})", [](U u) { return u.length == kareport::LengthUnit::InternationalFoot; }},
+        {R"({"length": "usft"})", [](U u) { return u.length == kareport::LengthUnit::UsSurveyFoot; }},
+        {R"({"area": "m2"})", [](U u) { return u.area == kareport::AreaUnit::SquareMetre; }},
+        {R"({"area": "ha"})", [](U u) { return u.area == kareport::AreaUnit::Hectare; }},
+        {R"({"area": "km2"})", [](U u) { return u.area == kareport::AreaUnit::SquareKilometre; }},
+        {R"({"area": "ft2"})", [](U u) { return u.area == kareport::AreaUnit::SquareFoot; }},
+        {R"({"area": "ac"})", [](U u) { return u.area == kareport::AreaUnit::Acre; }},
+        {R"({"angle": "deg"})", [](U u) { return u.angle == kareport::AngleUnit::Degree && !u.sexagesimal; }},
+        {R"({"angle": "gon"})", [](U u) { return u.angle == kareport::AngleUnit::Gon && !u.sexagesimal; }},
+        {R"({"angle": "rad"})", [](U u) { return u.angle == kareport::AngleUnit::Radian && !u.sexagesimal; }},
+        {R"({"angle": "dms"})", [](U u) { return u.angle == kareport::AngleUnit::Degree && u.sexagesimal; }},
+    };
+    for (const Row &row : rows) {
+        const QByteArray json = QByteArray(R"({"report": [], "data": {"p": {"csv": "p.csv", "units": )") + row.units + "}}}";
+        EXPECT_TRUE(row.holds(jobOf(json).data[QStringLiteral("p")].units)) << row.units;
+    }
+}
+
+TEST(JobReader, ReadsPageAndOptions)
+{
+    const Job job = jobOf(R"({"report": [], "title": "", "application": "TALVEN Survey", "header": false,
+        "now": "2024-03-05T14:07:00",
+        "page": {"paper": "Letter", "orientation": "landscape", "resolution": 300, "margins": [1, 2, 3, 4],
+                 "fontName": "Mono", "fontSize": 9, "linesPerPage": 1, "charsPerRow": 1, "printer": "default"},
+        "options": {"zeroBlank": true, "writeTableName": true, "printHash": true, "chainageLabel": "", "separator": 0,
+                    "excel": true}})");
+    EXPECT_EQ(job.title, QString()) << "an empty title is a title";
+    EXPECT_TRUE(job.title.has_value());
+    EXPECT_EQ(job.application, QStringLiteral("TALVEN Survey"));
+    EXPECT_FALSE(job.header);
+    EXPECT_EQ(job.now, QDateTime(QDate(2024, 3, 5), QTime(14, 7)));
+    EXPECT_EQ(job.page.printer.source, kareport::PrinterSource::SystemOrBuiltIn);
+    EXPECT_EQ(job.page.printer.paper, kareport::PaperSize::Letter);
+    EXPECT_EQ(job.page.printer.resolution, 300);
+    EXPECT_FALSE(job.page.portrait);
+    EXPECT_EQ(job.page.margins, QMargins(1, 2, 3, 4)) << "left, top, right, bottom";
+    EXPECT_EQ(job.page.fontName, QStringLiteral("Mono"));
+    EXPECT_EQ(job.page.fontSize, 9);
+    EXPECT_EQ(job.page.linesPerPage, 1);
+    EXPECT_EQ(job.page.charsPerRow, 1);
+    EXPECT_TRUE(job.options.zeroBlank);
+    EXPECT_TRUE(job.options.writeTableName);
+    EXPECT_TRUE(job.options.printHash);
+    EXPECT_TRUE(job.options.excel);
+    EXPECT_EQ(job.options.chainageLabel, QString());
+    EXPECT_EQ(job.options.separator, u'\0');
+}
+
+TEST(JobReader, ASeparatorIsACodeOrATextOfOneCharacter)
+{
+    struct Row
+    {
+        const char *separator;
+        char16_t expected;
+    };
+    constexpr Row rows[] = {{"124", u'|'}, {"\"|\"", u'|'}, {"9", u'\t'},      {"\"\\t\"", u'\t'},
+                            {"32", u' '},  {"\"9\"", u'9'}, {"255", u'\xFF'}, {"\"\xC2\xB7\"", u'\xB7'}};
+    for (const Row &row : rows) {
+        const QByteArray json = QByteArray(R"({"report": [], "options": {"separator": )") + row.separator + "}}";
+        EXPECT_EQ(jobOf(json).options.separator, row.expected) << row.separator;
+    }
+}
+
+TEST(JobReader, StepsHaveDefaults)
+{
+    const Job job = jobOf(R"({"template": {"file": "t.xml", "name": "T"}, "data": {"d": {"values": []}}, "report": [
+        {"heading": "H"}, {"line": "L"}, {"lineFeed": 3}, {"newPage": -1}, {"block": "B", "data": "d"},
+        {"table": "T", "data": "d"}, {"clear": true}]})");
+    ASSERT_EQ(job.steps.size(), 7U);
+    const auto heading = std::get<Job::Heading>(job.steps[0].action);
+    EXPECT_EQ(heading.text, QStringLiteral("H"));
+    EXPECT_EQ(heading.before, 0);
+    EXPECT_EQ(heading.after, 0);
+    const auto line = std::get<Job::Line>(job.steps[1].action);
+    EXPECT_EQ(line.text, QStringLiteral("L"));
+    EXPECT_EQ(line.before, 0);
+    EXPECT_EQ(line.after, 1) << "a line ends unless said";
+    EXPECT_EQ(line.style, 0);
+    EXPECT_EQ(std::get<Job::LineFeed>(job.steps[2].action).count, 3);
+    EXPECT_EQ(std::get<Job::NewPage>(job.steps[3].action).linesNeeded, -1);
+    const auto block = std::get<Job::Block>(job.steps[4].action);
+    EXPECT_EQ(block.name, QStringLiteral("B"));
+    EXPECT_EQ(block.data, QStringLiteral("d"));
+    EXPECT_EQ(block.before, 0);
+    EXPECT_EQ(block.after, 0);
+    const auto table = std::get<Job::Table>(job.steps[5].action);
+    EXPECT_EQ(table.name, QStringLiteral("T"));
+    EXPECT_EQ(table.data, QStringLiteral("d"));
+    EXPECT_EQ(table.before, 0);
+    EXPECT_EQ(table.after, 0);
+    EXPECT_EQ(table.headingAfter, -1);
+    EXPECT_TRUE(std::holds_alternative<Job::Clear>(job.steps[6].action));
+}
+
+TEST(JobReader, StepsTakeTheirNumbers)
+{
+    const Job job = jobOf(R"({"template": {"file": "t.xml", "name": "T"}, "data": {"d": {"values": {}}}, "report": [
+        {"heading": "", "before": 1, "after": 2}, {"line": "", "before": 3, "after": 0, "style": 1},
+        {"block": "B", "data": "d", "before": 4, "after": 5},
+        {"table": "T", "data": "d", "before": 6, "after": 7, "headingAfter": 8}]})");
+    ASSERT_EQ(job.steps.size(), 4U);
+    const auto heading = std::get<Job::Heading>(job.steps[0].action);
+    EXPECT_EQ(heading.before * 10 + heading.after, 12);
+    const auto line = std::get<Job::Line>(job.steps[1].action);
+    EXPECT_EQ(line.before * 100 + line.after * 10 + line.style, 301);
+    const auto block = std::get<Job::Block>(job.steps[2].action);
+    EXPECT_EQ(block.before * 10 + block.after, 45);
+    const auto table = std::get<Job::Table>(job.steps[3].action);
+    EXPECT_EQ(table.before * 100 + table.after * 10 + table.headingAfter, 678);
+}
+
+TEST(JobReader, PathsAreRelativeToTheJobFile)
+{
+    const QString elsewhere = QDir::rootPath() + QStringLiteral("other/p.csv");
+    const Job job = jobOf(R"({"report": [], "output": ["a.rep", "sub/b.TXT", "-", {"file": "c", "as": "text"},
+        {"file": "d.txt", "as": "rep"}], "data": {"near": {"csv": "in/p.csv"}, "far": {"csv": ")" +
+                          elsewhere.toUtf8() + R"(", "delimiter": "\t"}, "here": {"values": []}}})");
+    ASSERT_EQ(job.outputs.size(), 5U);
+    EXPECT_EQ(job.outputs[0].file, folder + QStringLiteral("/a.rep"));
+    EXPECT_EQ(job.outputs[0].kind, OutputKind::Report);
+    EXPECT_EQ(job.outputs[1].file, folder + QStringLiteral("/sub/b.TXT"));
+    EXPECT_EQ(job.outputs[1].kind, OutputKind::Text) << "case does not matter in an ending";
+    EXPECT_TRUE(job.outputs[2].isStandardOutput());
+    EXPECT_EQ(job.outputs[2].kind, OutputKind::Text);
+    EXPECT_EQ(job.outputs[3].file, folder + QStringLiteral("/c"));
+    EXPECT_EQ(job.outputs[3].kind, OutputKind::Text);
+    EXPECT_EQ(job.outputs[4].kind, OutputKind::Report) << "what is said wins over the ending";
+    EXPECT_EQ(job.data[QStringLiteral("near")].csv, folder + QStringLiteral("/in/p.csv"));
+    EXPECT_EQ(job.data[QStringLiteral("near")].delimiter, ',');
+    EXPECT_EQ(job.data[QStringLiteral("far")].csv, elsewhere);
+    EXPECT_EQ(job.data[QStringLiteral("far")].delimiter, '\t');
+    EXPECT_EQ(job.data[QStringLiteral("here")].csv, QString());
+}
+
+} // namespace

@@ -1,0 +1,115 @@
+#include "JsonPlaces.h"
+
+#include "JobFolder.h"
+
+#include <gtest/gtest.h>
+
+namespace
+{
+
+using kareport::JsonPath;
+using kareport::placeInJson;
+using kareport::placeOfByte;
+
+QString name(const char *text)
+{
+    return QString::fromUtf8(text);
+}
+
+JsonPath path(std::initializer_list<std::variant<QString, qsizetype>> steps)
+{
+    return JsonPath(steps);
+}
+
+struct Row
+{
+    const char *json;
+    JsonPath path;
+    const char *key;
+    const char *value;
+    const char *reason;
+};
+
+const Row rows[] = {
+    {"{}", {}, "1:1", "1:1", "the root itself"},
+    {" \n\t {}", {}, "2:3", "2:3", "white space in front; a tab is one column"},
+    {R"({"a": 1})", path({name("a")}), "1:2", "1:7", "a member's name and its value"},
+    {R"({"a":1})", path({name("a")}), "1:2", "1:6", "no blank behind the colon"},
+    {"\xEF\xBB\xBF{\"a\": 1}", path({name("a")}), "1:2", "1:7", "a byte-order mark takes no column"},
+    {"{\n  \"a\"\n :\n   1}", path({name("a")}), "2:3", "4:4", "name and value in lines of their own"},
+    {"{\r\n \"a\":1}", path({name("a")}), "2:2", "2:6", "lines that end with CR LF"},
+    {R"({"a": {"b": {"c": true}}})", path({name("a"), name("b"), name("c")}), "1:14", "1:19", "members in members"},
+    {R"({"a": [10, [20, 21], {"b": 3}]})", path({name("a"), qsizetype(0)}), "1:8", "1:8", "the first element"},
+    {R"({"a": [10, [20, 21], {"b": 3}]})", path({name("a"), qsizetype(1), qsizetype(1)}), "1:17", "1:17",
+     "a list in a list"},
+    {R"({"a": [10, [20, 21], {"b": 3}]})", path({name("a"), qsizetype(2), name("b")}), "1:23", "1:28",
+     "a member of an element"},
+    {R"({"x": "},]\"{", "y": 2})", path({name("y")}), "1:17", "1:22", "brackets and quotes inside a text"},
+    {R"({"x": "\\", "y": 2})", path({name("y")}), "1:13", "1:18", "a text that ends with a backslash"},
+    {R"({"x": [{}, []], "y": 2})", path({name("y")}), "1:17", "1:22", "empty objects and lists"},
+    {R"({"x": -1.5e+3, "y": null, "z": false})", path({name("z")}), "1:27", "1:32", "words and numbers before it"},
+    {R"({"\u0061": 1})", path({name("a")}), "1:2", "1:12", "a name written with an escape"},
+    {"{\"\xC3\xA4\": 1, \"b\": 2}", path({name("b")}), "1:10", "1:15", "columns count characters, not bytes"},
+    {"{\"\xF0\x9D\x84\x9E\": 1, \"b\": 2}", path({name("b")}), "1:10", "1:15", "a surrogate pair is one character"},
+    {"{\"\xE6\xB8\xAC\": 1}", path({name("\xE6\xB8\xAC")}), "1:2", "1:7", "a name outside ASCII"},
+    {R"({"a": 1, "a": 2})", path({name("a")}), "1:10", "1:15", "of members of one name the last counts"},
+    {R"({"a": 1, "A": 2})", path({name("a")}), "1:2", "1:7", "case matters"},
+    {R"({"": 1})", path({QString()}), "1:2", "1:6", "an empty name"},
+    {R"({"b": 1})", path({name("a")}), "none", "none", "no such member"},
+    {R"({})", path({name("a")}), "none", "none", "no member at all"},
+    {R"({"a": []})", path({name("a"), qsizetype(0)}), "none", "none", "no element at all"},
+    {R"({"a": [1]})", path({name("a"), qsizetype(1)}), "none", "none", "behind the last element"},
+    {R"({"a": [1]})", path({name("a"), qsizetype(-1)}), "none", "none", "before the first element"},
+    {R"({"a": [1]})", path({name("a"), name("0")}), "none", "none", "a name leads into no list"},
+    {R"({"a": {"0": 1}})", path({name("a"), qsizetype(0)}), "none", "none", "an index leads into no object"},
+    {R"({"a": "b"})", path({name("a"), name("b")}), "none", "none", "nothing is inside a text"},
+};
+
+TEST(JsonPlaces, FindsNamesAndValues)
+{
+    for (const Row &row : rows) {
+        EXPECT_EQ(placeText(placeInJson(row.json, row.path, true)), name(row.key)) << row.reason;
+        EXPECT_EQ(placeText(placeInJson(row.json, row.path, false)), name(row.value)) << row.reason;
+    }
+}
+
+TEST(JsonPlaces, FindsTheLastOfManyElements)
+{
+    QByteArray json = "[";
+    for (int i = 0; i < 10000; ++i) {
+        json += "{\"n\": [" + QByteArray::number(i) + "]},\n";
+    }
+    json += "{\"n\": 7}]";
+    EXPECT_EQ(placeText(placeInJson(json, path({qsizetype(10000), name("n")}))), QStringLiteral("10001:7"));
+}
+
+TEST(JsonPlaces, PlacesAByte)
+{
+    struct ByteRow
+    {
+        const char *text;
+        qsizetype byte;
+        const char *expected;
+        const char *reason;
+    };
+    constexpr ByteRow byteRows[] = {
+        {"", 0, "1:1", "an empty text"},
+        {"ab\ncd", 0, "1:1", "the first byte"},
+        {"ab\ncd", 2, "1:3", "the line end belongs to its line"},
+        {"ab\ncd", 3, "2:1", "the first byte of a line"},
+        {"ab\ncd", 5, "2:3", "the end"},
+        {"ab\ncd", 99, "2:3", "behind the end is the end"},
+        {"ab\ncd", -1, "1:1", "before the beginning is the beginning"},
+        {"\xC3\xA4"
+         "b",
+         2, "1:2", "a character of two bytes"},
+        {"\xF0\x9D\x84\x9E"
+         "b",
+         4, "1:2", "a character of four bytes"},
+    };
+    for (const ByteRow &row : byteRows) {
+        EXPECT_EQ(placeText(placeOfByte(row.text, row.byte)), name(row.expected)) << row.reason;
+    }
+}
+
+} // namespace
