@@ -1,5 +1,7 @@
 #include "CsvReader.h"
 
+#include "PosixProcessorTime.h"
+
 #include <benchmark/benchmark.h>
 
 #include <string>
@@ -14,6 +16,7 @@ void readCsv(benchmark::State &state)
     for (qint64 i = 0; i < state.range(0); ++i) {
         text += std::to_string(i) + ",6295.3311,16603.3967,108.584,12.345,P75954\n";
     }
+    const ProcessorTime time;
     for (auto _ : state) {
         kareport::CsvReader reader(QStringLiteral("bench.csv"), text, ',');
         qint64 rows = 0;
@@ -25,6 +28,7 @@ void readCsv(benchmark::State &state)
         }
     }
     state.SetBytesProcessed(state.iterations() * qint64(text.size()));
+    time.report(state, static_cast<double>(qint64(text.size())));
 }
 BENCHMARK(readCsv)->Arg(100'000)->Arg(1'000'000)->Unit(benchmark::kMillisecond);
 

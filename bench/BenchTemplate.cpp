@@ -2,6 +2,8 @@
 
 #include <QTemporaryFile>
 
+#include "PosixProcessorTime.h"
+
 #include <benchmark/benchmark.h>
 
 namespace
@@ -41,6 +43,7 @@ void loadTemplate(benchmark::State &state)
     file.write(text);
     file.flush();
     const QString name = QStringLiteral("t%1").arg(state.range(0) - 1);
+    const ProcessorTime time;
     for (auto _ : state) {
         UXmlReportTpl reportTemplate;
         if (!reportTemplate.LoadTemplate(file.fileName(), name)) {
@@ -48,6 +51,7 @@ void loadTemplate(benchmark::State &state)
         }
     }
     state.SetBytesProcessed(state.iterations() * text.size());
+    time.report(state, static_cast<double>(text.size()));
 }
 BENCHMARK(loadTemplate)->Arg(200)->Arg(2000)->Unit(benchmark::kMillisecond);
 
@@ -63,6 +67,7 @@ void loadManyFields(benchmark::State &state)
     file.open();
     file.write(text);
     file.flush();
+    const ProcessorTime time;
     for (auto _ : state) {
         UXmlReportTpl reportTemplate;
         reportTemplate.LoadTemplate(file.fileName(), QStringLiteral("A"));
@@ -72,6 +77,7 @@ void loadManyFields(benchmark::State &state)
         }
     }
     state.SetItemsProcessed(state.iterations() * state.range(0));
+    time.report(state, static_cast<double>(state.range(0)));
 }
 BENCHMARK(loadManyFields)->Arg(10'000)->Arg(100'000)->Unit(benchmark::kMillisecond);
 
@@ -84,11 +90,13 @@ void scanUnclosedTags(benchmark::State &state)
     file.open();
     file.write(text);
     file.flush();
+    const ProcessorTime time;
     for (auto _ : state) {
         UXmlReportTpl reportTemplate;
         benchmark::DoNotOptimize(reportTemplate.LoadTemplate(file.fileName(), QStringLiteral("A")));
     }
     state.SetBytesProcessed(state.iterations() * text.size());
+    time.report(state, static_cast<double>(text.size()));
 }
 BENCHMARK(scanUnclosedTags)->Arg(10'000)->Arg(100'000)->Unit(benchmark::kMillisecond);
 

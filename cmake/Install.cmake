@@ -8,6 +8,7 @@ foreach(library KaReportHost KaReport)
 endforeach()
 install(TARGETS kareport RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR})
 install(FILES LICENSES.md CHANGELOG.md DESTINATION ${CMAKE_INSTALL_DOCDIR})
+install(FILES examples/survey.xml DESTINATION ${CMAKE_INSTALL_DATADIR}/kareport/templates)
 install(FILES docs/kareport.1 DESTINATION ${CMAKE_INSTALL_MANDIR}/man1)
 
 set(config_dir ${CMAKE_INSTALL_LIBDIR}/cmake/KaReport)

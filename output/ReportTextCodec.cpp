@@ -1,9 +1,11 @@
 #include "ReportTextCodec.h"
 
 #include <QChar>
+#include <QIODevice>
 
-#include <array>
+#include <algorithm>
 #include <cstdint>
+#include <vector>
 
 namespace kareport
 {
@@ -124,6 +126,44 @@ std::size_t ReportTextEncoder::encodeCharacters(const Character *at, const Chara
         }
     }
     return static_cast<std::size_t>(out - begin);
+}
+
+namespace
+{
+
+constexpr qsizetype pieceSize = 64 * 1024;
+
+template <typename Text>
+bool writePieces(QIODevice &device, Text text, LineEnds lineEnds)
+{
+    if (lineEnds == LineEnds::ReportFile &&
+        device.write(reportFileMark, sizeof reportFileMark) != qint64(sizeof reportFileMark))
+    {
+        return false;
+    }
+    ReportTextEncoder encoder(lineEnds);
+    std::vector<char> bytes(ReportTextEncoder::bound(pieceSize));
+    for (qsizetype at = 0; at < text.size(); at += pieceSize) {
+        const qsizetype count = std::min(pieceSize, text.size() - at);
+        const auto size =
+            static_cast<qint64>(encoder.encode(text.sliced(at, count), bytes.data(), at + count == text.size()));
+        if (device.write(bytes.data(), size) != size) {
+            return false;
+        }
+    }
+    return true;
+}
+
+} // namespace
+
+bool writeReportText(QIODevice &device, QStringView text, LineEnds lineEnds)
+{
+    return writePieces(device, text, lineEnds);
+}
+
+bool writeReportText(QIODevice &device, QLatin1StringView text, LineEnds lineEnds)
+{
+    return writePieces(device, text, lineEnds);
 }
 
 } // namespace kareport

@@ -7,6 +7,8 @@
 
 #include <cstddef>
 
+class QIODevice;
+
 namespace kareport
 {
 
@@ -42,5 +44,9 @@ private:
 
 /// The bytes that a report file begins with: the UTF-8 byte-order mark.
 inline constexpr char reportFileMark[] = {'\xEF', '\xBB', '\xBF'};
+
+/// Writes report text to an open device, a piece at a time. @return false as soon as a write fails
+KAREPORT_EXPORT bool writeReportText(QIODevice &device, QStringView text, LineEnds lineEnds);
+KAREPORT_EXPORT bool writeReportText(QIODevice &device, QLatin1StringView text, LineEnds lineEnds);
 
 } // namespace kareport

@@ -33,9 +33,7 @@ QString withChainageLabel(QString heading, const QString &label)
 
 void DataWriter::writeBlock(const UXmlReportBlock &block, const UDataObject &object, int linesBefore, int linesAfter)
 {
-    if (!page_.newPage(linesBefore)) {
-        page_.lineFeed(linesBefore);
-    }
+    page_.skipLines(linesBefore);
     for (int i = 0; i < block.GetFieldsCount(); ++i) {
         const sXmlReportField field = block.GetField(i);
         const FieldFormatter formatter(field);
@@ -56,9 +54,7 @@ void DataWriter::writeBlock(const UXmlReportBlock &block, const UDataObject &obj
 
 void DataWriter::writeTable(const UXmlReportTable &table, UDataObjectList &list, const TableLayout &layout)
 {
-    if (!page_.newPage(layout.linesBefore)) {
-        page_.lineFeed(layout.linesBefore);
-    }
+    page_.skipLines(layout.linesBefore);
     std::vector<quint32> sortIds;
     table.GetSortList(sortIds);
     if (!sortIds.empty()) {
@@ -144,9 +140,7 @@ void DataWriter::formatRow(const std::vector<FieldFormatter> &fields, const UDat
 void DataWriter::endOutput(int linesAfter)
 {
     page_.setHeading(noHeading);
-    if (!page_.newPage(linesAfter)) {
-        page_.lineFeed(linesAfter);
-    }
+    page_.skipLines(linesAfter);
 }
 
 } // namespace kareport

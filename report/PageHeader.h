@@ -9,7 +9,7 @@ namespace kareport
 {
 
 /// The header line of every page, without the page number: application, title, and the date right-aligned so that the
-/// line with its number fills the row. Where the row is too short for that, the date stands left and is filled on its
+/// line with label and number ends a few characters before the row does. Where the row is too short for that, the date stands left and is filled on its
 /// right; this follows from the one width that the line is made with and is kept.
 KAREPORT_EXPORT QString pageHeaderLine(const QString &application, const QString &title, const QDateTime &time,
                                        const QString &pageLabel, int charsPerRow);

@@ -10,6 +10,8 @@
 #include <QPrinter>
 #include <QPrinterInfo>
 
+#include <algorithm>
+#include <climits>
 #include <cmath>
 
 namespace kareport
@@ -22,6 +24,11 @@ constexpr int hundredthsPerInch = 2540; // of a millimetre
 constexpr qreal millimetresPerInch = 25.4;
 constexpr int pointsPerInch = 72;
 constexpr qsizetype longestFaceName = 31;
+
+int clampToInt(qint64 value)
+{
+    return static_cast<int>(std::clamp<qint64>(value, INT_MIN, INT_MAX));
+}
 
 QPageSize::PageSizeId sheetOf(PaperSize paper)
 {
@@ -57,18 +64,19 @@ int mulDiv(int a, int b, int c)
 {
     const qint64 product = qint64(a) * b;
     const qint64 half = c / 2;
-    return static_cast<int>((product < 0 ? product - half : product + half) / c);
+    return clampToInt((product < 0 ? product - half : product + half) / c);
 }
 
 PageGeometry measurePage(const PageDevice &device, const QMargins &margins, const FontExtents &font)
 {
-    const auto dots = [&](int margin) { return mulDiv(margin, device.resolution, hundredthsPerInch); };
+    const auto dots = [&](int margin) { return qint64(mulDiv(margin, device.resolution, hundredthsPerInch)); };
     PageGeometry geometry;
     geometry.pageSize = device.size;
     geometry.resolution = static_cast<unsigned>(device.resolution);
-    geometry.linesPerPage =
-        (device.size.height() - dots(margins.bottom()) - dots(margins.top())) / (font.height + font.externalLeading);
-    geometry.charsPerRow = (device.size.width() - dots(margins.right()) - dots(margins.left())) / font.averageWidth;
+    geometry.linesPerPage = clampToInt((device.size.height() - dots(margins.bottom()) - dots(margins.top())) /
+                                       (qint64(font.height) + font.externalLeading));
+    geometry.charsPerRow =
+        clampToInt((device.size.width() - dots(margins.right()) - dots(margins.left())) / font.averageWidth);
     return geometry;
 }
 

@@ -42,9 +42,9 @@ bool PageWriter::write(QStringView text, int style)
     return true;
 }
 
-void PageWriter::lineFeed(int count)
+void PageWriter::lineFeed(qint64 count)
 {
-    for (int i = 0; i < count; ++i) {
+    for (qint64 i = 0; i < count; ++i) {
         if (!text_.appendLineEnd()) {
             return;
         }
@@ -75,13 +75,13 @@ void PageWriter::breakPage()
     }
 }
 
-bool PageWriter::newPage(int linesNeeded)
+bool PageWriter::newPage(qint64 linesNeeded)
 {
     if (lineCount_ == 0) {
         beginFirstPage();
         return true;
     }
-    const int remaining = linesLeft();
+    const qint64 remaining = linesLeft();
     if (remaining != 0 && linesNeeded >= 0 && linesNeeded < remaining) {
         return false;
     }
@@ -89,17 +89,20 @@ bool PageWriter::newPage(int linesNeeded)
     return true;
 }
 
+void PageWriter::skipLines(qint64 count)
+{
+    if (!newPage(count)) {
+        lineFeed(count);
+    }
+}
+
 void PageWriter::writeLine(QStringView text, int linesBefore, int linesAfter, int style)
 {
-    if (!newPage(linesBefore)) {
-        lineFeed(linesBefore);
-    }
+    skipLines(linesBefore);
     write(text, style);
     if (linesAfter != 0) {
         lineFeed(1);
-        if (!newPage(linesAfter - 1)) {
-            lineFeed(linesAfter - 1);
-        }
+        skipLines(qint64(linesAfter) - 1);
     }
     noteChange();
 }
@@ -120,7 +123,7 @@ void PageWriter::writeHeader()
     lineNumber_ += lineFeeds;
     lineCount_ += lineFeeds;
     write(headerLine_ + QStringLiteral("%1").arg(pageNumber_, 3), 0);
-    lineFeed(heading_.linesBefore + headerGap);
+    lineFeed(qint64(heading_.linesBefore) + headerGap);
     write(heading_.text, 0);
     lineFeed(heading_.linesAfter);
     noteChange();

@@ -50,7 +50,6 @@ public:
     bool headerFlag() const { return headerFlag_; }
     /// The header line without its page number, which every page adds.
     void setHeaderLine(const QString &line) { headerLine_ = line; }
-    const QString &headerLine() const { return headerLine_; }
     void setHeading(PageHeading heading) { heading_ = std::move(heading); }
     const PageHeading &heading() const { return heading_; }
 
@@ -59,10 +58,12 @@ public:
     /// Appends text as it is, counting its line feeds. @return false, changing nothing, when there is no room
     bool write(QStringView text, int style);
     /// Ends the line so many times; stops where there is no room.
-    void lineFeed(int count);
+    void lineFeed(qint64 count);
     /// Starts a new page when so many lines and one more do not fit, always for a number below 0.
     /// @return whether it did
-    bool newPage(int linesNeeded);
+    bool newPage(qint64 linesNeeded);
+    /// Leaves so many lines blank, or starts a new page where they do not fit.
+    void skipLines(qint64 count);
     /// Writes a line: blank lines before it (dropped at a page's start), the text, line ends after it. With 0 after, the
     /// line stays open.
     void writeLine(QStringView text, int linesBefore, int linesAfter, int style);
@@ -70,13 +71,11 @@ public:
     void breakPage();
     /// What `newPage` does before anything is written.
     void beginFirstPage();
-    int linesLeft() const { return linesPerPage_ - lineNumber_; }
+    qint64 linesLeft() const { return qint64(linesPerPage_) - lineNumber_; }
     void writeHeading();
     void writeHeader();
     /// Tells the observer that something was changed.
     void noteChange();
-    /// One more line than the text's line ends say, for a reader that gives lines without counting them.
-    void countLine() { ++lineCount_; }
 
 private:
     static constexpr int headerGap = 4; ///< line ends behind the header line

@@ -52,7 +52,7 @@ UReportDoc *CreateReport(const QString &name, bool headerFlag, bool externalEdit
         return nullptr;
     }
     auto *report =
-        static_cast<UReportDoc *>(reportTemplate->OpenReportDocumentFile(QString(), show, show, pane, style, rect));
+        dynamic_cast<UReportDoc *>(reportTemplate->OpenReportDocumentFile(QString(), show, show, pane, style, rect));
     if (report == nullptr) {
         return nullptr;
     }

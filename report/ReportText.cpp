@@ -1,6 +1,9 @@
 #include "ReportText.h"
 
+#include <QString>
+
 #include <algorithm>
+#include <functional>
 #include <new>
 
 namespace kareport
@@ -61,7 +64,15 @@ bool ReportText::widen() const
 
 bool ReportText::append(QStringView text)
 {
-    if (size() + text.size() > longest || (isNarrow_ && !isLatin1(text) && !widen())) {
+    if (size() + text.size() > longest) {
+        return false;
+    }
+    // A piece of this very text would move with it.
+    const auto *begin = text.utf16();
+    if (!isNarrow_ && std::less_equal<>()(wide_.data(), begin) && std::less<>()(begin, wide_.data() + wide_.size())) {
+        return append(text.toString());
+    }
+    if (isNarrow_ && !isLatin1(text) && !widen()) {
         return false;
     }
     if (!reserve(size() + text.size())) {
@@ -98,8 +109,9 @@ bool ReportText::appendLineEnd()
 
 bool ReportText::assign(QStringView text)
 {
+    const QString copy = text.toString(); // it may be a piece of this very text
     (isNarrow_ ? narrow_.setSize(0) : wide_.setSize(0));
-    return append(text);
+    return append(copy);
 }
 
 void ReportText::clear()

@@ -34,7 +34,8 @@ public:
     bool isEmpty() const { return size() == 0; }
     QStringView view() const;
 
-    /// Whether the text is kept with one byte a character: `narrowView` then shows it as it is.
+    /// Whether the text is kept with one byte a character: `narrowView` then shows it as it is, until the text is changed
+    /// or asked for in UTF-16.
     bool isNarrow() const { return isNarrow_; }
     QLatin1StringView narrowView() const;
 

@@ -11,6 +11,8 @@
 #include "UPreviewDlg.h"
 #include "Xlate.h"
 
+#include <utility>
+
 namespace
 {
 
@@ -44,7 +46,7 @@ UReportDoc::UReportDoc(const QString &name, bool externalEditor, bool closeDocum
 UReportDoc::~UReportDoc()
 {
     UReportMgr.remove(this);
-    delete reportWindow_;
+    delete std::exchange(reportWindow_, nullptr);
 }
 
 bool UReportDoc::IsReportAvailable(const UReportDoc *report)

@@ -31,14 +31,15 @@ struct FormatOptions;
 /// A report: fixed-pitch text laid out in pages and lines, written by host code or through a template.
 ///
 /// Reports are made through their document template (`CreateReport`), which owns them. Functions answer false or 0 when
-/// they cannot do what they are asked, and never throw. Every function that writes text sets the modified flag.
+/// they cannot do what they are asked, and never throw. What writes text, line ends or a page header sets the modified flag.
 class KAREPORT_EXPORT UReportDoc : public UDocument, private kareport::PageWriterObserver
 {
 public:
     /// @param name            title and report file name; a null text for none
     /// @param externalEditor  meant for the user's preferred editor
     /// @param closeDocument   closes as soon as its content has been handed to an editor
-    /// @param owner           the host document that asked for the report, told when it goes; null for none, not owned
+    /// @param owner           the host document that asked for the report, told when it goes; null for none. It is not
+    ///                        owned and must outlive the report
     UReportDoc(const QString &name, bool externalEditor, bool closeDocument, UDocument *owner);
     UReportDoc();
     ~UReportDoc() override;
@@ -59,7 +60,7 @@ public:
     void SetData(const QString &text);
     /// Empties the report. The next line written begins page 1.
     virtual void Clear();
-    /// Makes room for so many characters. @return 0 when there is no memory for them
+    /// Makes room for so many characters of the kind written so far. @return 0 when there is no memory for them
     int CheckSize(int required);
 
     /// Appends text as it is. @param style  handed on to the rich text: 0 plain, 1 bold, 2 underlined, 3 both
@@ -88,8 +89,8 @@ public:
 
     /// Measures the page on the default printer. @return 1, or 0 without a printer: the figures then stay as they were
     int SetPageSize();
-    /// Fixes the lines of a page or the characters of a row, whatever is measured; with both, no font is measured.
-    /// Figures are 1 or more.
+    /// Fixes the lines of a page or the characters of a row (1 or more), whatever is measured; with both, no font is
+    /// measured. What is not given is measured again by the next `SetPageSize`.
     void FixPage(std::optional<int> linesPerPage, std::optional<int> charsPerRow);
     int GetLinesPerPage() const { return page_.linesPerPage(); }
     int GetCharsPerRow() const { return geometry_.charsPerRow; }
@@ -114,9 +115,14 @@ public:
     // --- Templates and data -----------------------------------------------------------------------------------------
 
     /// Loads a template from a file of the library folder or, failing that, of the start folder, and with it a table
-    /// and a block unless their names are empty. Takes over the template's separator, page breaks and title.
+    /// and a block unless their names are empty. Takes over the template's separator and page breaks, and its title once
+    /// table and block are loaded. Whatever table and block were loaded before go with the template before.
+    /// @return false when neither file has the template (separator, page breaks and title then stay), or when table or
+    ///         block cannot be loaded
     bool LoadTemplateXml(const QString &fileName, const QString &templateName, const QString &tableName,
                          const QString &blockName);
+    /// Loads a table, or a block, of the loaded template in the place of the one before, which is gone also when this
+    /// fails. @return false without a template, or when it has no such table or block or not its dictionary
     bool LoadTemplateTable(const QString &tableName);
     bool LoadTemplateBlock(const QString &blockName);
     /// The loaded template, or null.
@@ -129,12 +135,13 @@ public:
                                      const QString &offsetStyle) const;
 
     /// Writes an object through the loaded block: a line for each field that the object has a value for.
-    /// @return false, with nothing written, when no block is loaded
+    /// @return false, with nothing written, when no block is loaded or the object is null
     bool WriteDataBlock(const UDataObject *object, int linesBefore, int linesAfter);
     bool WriteDataBlock(const QString &blockName, const UDataObject *object, int linesBefore, int linesAfter);
     /// Writes a list through the loaded table: heading, then a line for each object, sorted if the table says so.
     /// @param headingLinesAfter  line ends behind the heading; -1 for 2
-    /// @return false, with nothing written, when no table is loaded
+    /// @return false, with nothing written, when no table is loaded or the list is null; false as well when memory runs
+    ///         out in the middle
     bool WriteDataTable(UDataObjectList *list, int linesBefore, int linesAfter, int headingLinesAfter);
     bool WriteDataTable(const QString &tableName, UDataObjectList *list, int linesBefore, int linesAfter,
                         int headingLinesAfter);
@@ -195,6 +202,7 @@ public:
     bool OnSaveDocument(const QString &path) override;
     bool CanCloseFrame(CViewPane *pane) override;
     void OnCloseDocument() override;
+    void OnAutoDelete() override;
     /// Closes the report at once or, when closing has been deferred, asks for it: the next call closes.
     void CloseReportDocument();
     /// 0 closes normally, 1 defers closing, 2 closing has been asked for.

@@ -34,12 +34,13 @@ bool isTaken(const QString &title, const QStringList &captions)
 
 void UReportDoc::SetTitle(const QString &title)
 {
-    title_ = title;
+    const QString given = title; // may be the very title that is numbered below
+    title_ = given;
     SetHeader();
     QStringList captions;
     CViewPane::GetPaneCaptions(captions);
     for (int number = 2; isTaken(title_, captions); ++number) {
-        title_ = title + u' ' + QString::number(number);
+        title_ = given + u' ' + QString::number(number);
     }
     UDocument::SetTitle(title_);
 }
@@ -117,17 +118,17 @@ void UReportDoc::OnCloseDocument()
         }
     }
     if (!IsSearchAndOrganizeHandler() || IsAutoDelete()) {
-        CloseAllPanes();
-        OnDocumentEvent(DocumentEvent::AfterCloseDocument);
-        DeleteContents();
-        if (IsAutoDelete()) {
-            if (owner_ != nullptr) {
-                owner_->OnReportClosed(this);
-            }
-            delete this;
-        }
+        UDocument::OnCloseDocument();
     }
-    if (windowPane != nullptr) {
+    // The pane may have gone with the report's views.
+    if (windowPane != nullptr && CViewPane::IsOpen(windowPane)) {
         windowPane->ClosePane();
+    }
+}
+
+void UReportDoc::OnAutoDelete()
+{
+    if (owner_ != nullptr) {
+        owner_->OnReportClosed(this);
     }
 }

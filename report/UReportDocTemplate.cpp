@@ -23,7 +23,7 @@ QString fileIn(QString folder, const QString &fileName)
 
 bool UReportDoc::LoadTemplateXml(const QString &fileName, const QString &templateName, const QString &tableName,
                                  const QString &blockName)
-{
+try {
     // The handles point into the template that goes: they go with it.
     table_.reset();
     block_.reset();
@@ -45,10 +45,12 @@ bool UReportDoc::LoadTemplateXml(const QString &fileName, const QString &templat
     }
     SetTitle(template_->GetTemplateTitle());
     return true;
+} catch (const std::bad_alloc &) {
+    return false;
 }
 
 bool UReportDoc::LoadTemplateTable(const QString &tableName)
-{
+try {
     if (!template_) {
         return false;
     }
@@ -61,6 +63,8 @@ bool UReportDoc::LoadTemplateTable(const QString &tableName)
         table_->ReorderingHeading();
     }
     return true;
+} catch (const std::bad_alloc &) {
+    return false;
 }
 
 bool UReportDoc::LoadTemplateBlock(const QString &blockName)
@@ -79,10 +83,12 @@ kareport::FormatOptions UReportDoc::formatOptions() const
 
 QString UReportDoc::FormatXmlStringToDisplay(const sXmlReportField *field, int kind, const void *value,
                                              const QString &offsetStyle) const
-{
+try {
     kareport::TextBuffer text;
     kareport::FieldFormatter(*field).append(text, formatOptions(), kind, value, offsetStyle);
     return text.view().toString();
+} catch (const std::bad_alloc &) {
+    return QString(); // a column of a template may be wider than there is memory
 }
 
 bool UReportDoc::WriteDataBlock(const UDataObject *object, int linesBefore, int linesAfter)
@@ -112,6 +118,7 @@ try {
         .writeTable(*table_, *list, {linesBefore, linesAfter, headingLinesAfter, chainageLabel_, writeTableName_});
     return true;
 } catch (const std::bad_alloc &) {
+    page_.setHeading({QString(), 0, 2}); // the table's own must not stand over what is written next
     return false;
 }
 

@@ -30,7 +30,7 @@ public:
     quint32 id() const { return id_; }
 
     /// Appends a value's text, fitted to the field's column.
-    /// @param kind    what `value` points to: 1 a bool, 2 a qint16, 4 a qint32, 8 a double in internal units, 16 a
+    /// @param kind    what `value` points to: 1 a byte that is 0 or not, 2 a qint16, 4 a qint32, 8 a double in internal units, 16 a
     ///                QString, 32 a UPointNumber; any other kind counts as 0, false or an empty text
     /// @param suffix  "+" shows an offset with its sign, anything else with "L" or "R" behind it
     void append(TextBuffer &out, const FormatOptions &options, int kind, const void *value, QStringView suffix) const;
@@ -46,7 +46,6 @@ private:
 
     void appendValue(TextBuffer &out, const FormatOptions &options, const Input &input, QStringView suffix) const;
     void appendNumber(TextBuffer &out, double value, int decimals) const;
-    void appendLength(TextBuffer &out, const UJobSettings &settings, double value) const;
     void appendBearing(TextBuffer &out, const UJobSettings &settings, double value) const;
     void appendOffset(TextBuffer &out, const UJobSettings &settings, double value, bool withSign) const;
     void appendThickness(TextBuffer &out, double value) const;

@@ -1,7 +1,7 @@
 #pragma once
 
 /// Order of the northing and easting columns.
-enum ORIENTATION_ORDER
+enum ORIENTATION_ORDER : int
 {
     ORDER_EASTING_NORTHING = 0,
     ORDER_NORTHING_EASTING = 1

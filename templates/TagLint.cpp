@@ -44,7 +44,9 @@ QStringView nameIn(QStringView tag)
         ++begin;
     }
     qsizetype end = begin;
-    while (end < tag.size() && tag[end].unicode() < 128 && tag[end].isLetter()) {
+    while (end < tag.size() && (tag[end].isLetterOrNumber() || tag[end] == u'_' || tag[end] == u'-' ||
+                                tag[end] == u':' || tag[end] == u'.'))
+    {
         ++end;
     }
     return tag.sliced(begin, end - begin);

@@ -32,7 +32,8 @@ using ScanNotes = std::vector<ScanNote>;
 struct ScanElement
 {
     ScanText value;        ///< what stands between the tags, as it stands
-    qsizetype source = -1; ///< where its opening tag stands in the file; -1 when there is no such element
+    qsizetype source = -1; ///< where its opening tag stands in the file, the end of one that a cut has joined; -1 when
+                           ///< there is no such element
 
     bool exists() const { return source >= 0; }
 };

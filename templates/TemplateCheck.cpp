@@ -23,9 +23,33 @@ QString bracketed(QStringView tag)
     return u'<' + elementName(tag) + u'>';
 }
 
+/// A value for a message, cut short.
 QString quoted(const ScanElement &element)
 {
-    return u'"' + element.value.text() + u'"';
+    constexpr qsizetype longestQuote = 60;
+    const QString &text = element.value.text();
+    return u'"' + (text.size() > longestQuote ? text.left(longestQuote) + u'…' : text) + u'"';
+}
+
+bool isError(const ScanNote &note)
+{
+    return note.kind != ScanNote::Kind::ShortCloseDrops;
+}
+
+QString textOf(const ScanNote &note)
+{
+    const QString tag = bracketed(note.tag);
+    switch (note.kind) {
+    case ScanNote::Kind::EmptyEndsList:
+        return Xlate("an empty %1 ends its list: what follows in the list is not read").arg(tag);
+    case ScanNote::Kind::ClosedBeforeOpen:
+        return Xlate("%1 is not read: a closing tag of that name stands before it").arg(tag);
+    case ScanNote::Kind::Unclosed: return Xlate("%1 is not read: its closing tag was expected").arg(tag);
+    case ScanNote::Kind::RunsOn:
+        return Xlate("%1 stands in another %1: the outer one is cut short at the first closing tag").arg(tag);
+    case ScanNote::Kind::ShortCloseDrops: break;
+    }
+    return Xlate("\"%1\" is dropped with the short closing tag of %2").arg(note.text, tag);
 }
 
 class Checker
@@ -45,7 +69,7 @@ private:
     void checkDictionaries(const std::vector<DictionaryElement> &dictionaries);
     void checkVariables(const DictionaryElement &dictionary);
     void checkOutput(const OutputElement &output, bool isTable);
-    void checkField(const FieldElement &field, const QString &use, bool isTable);
+    void checkField(const FieldElement &field, const QSet<QString> *variables, bool isTable);
     void checkText(const ScanElement &element);
     void addNotes();
 
@@ -60,7 +84,7 @@ std::vector<TemplateRemark> Checker::check()
 {
     checkTags();
     const auto templates = readTemplateElements(scan_, &notes_);
-    if (templates.empty()) {
+    if (templates.empty() && notes_.empty()) {
         error(0, Xlate("no template was read: a <ReportTemplate> element was expected"));
     }
     checkNames(templates);
@@ -106,16 +130,13 @@ void Checker::checkNames(const std::vector<TemplateElement> &templates)
 void Checker::checkTemplate(const TemplateElement &element)
 {
     const ScanText &body = element.body.value;
-    for (const auto *tag : {u"TABLES", u"BLOCKS", u"DICTIONARIES"}) {
+    for (const auto *tag : {u"TABLES", u"BLOCKS"}) {
         const ScanElement list = GetNode(body, tag);
-        if (!list.exists()) {
-            continue;
-        }
-        for (const ScanElement *part : {&element.name, &element.title}) {
-            if (part->exists() && part->source > list.source) {
-                error(part->source, Xlate("the template's own %1 must stand before %2: this one was taken for it")
-                                        .arg(bracketed(part == &element.name ? u"NAME" : u"TITLE"), bracketed(tag)));
-            }
+        if (list.exists() && element.name.source > list.source) {
+            error(
+                element.name.source,
+                Xlate("the template's own <Name> must stand before %1: this one was taken for it").arg(bracketed(tag)));
+            break;
         }
     }
     checkText(element.title);
@@ -204,19 +225,19 @@ void Checker::checkOutput(const OutputElement &output, bool isTable)
     if (output.fields.empty()) {
         warning(output.element.source, Xlate("%1 has no fields").arg(quoted(output.name)));
     }
-    const QString use = hasDictionary ? foldedKey(output.use.value.view()) : QString();
+    const QSet<QString> *variables =
+        hasDictionary ? &*variables_.constFind(foldedKey(output.use.value.view())) : nullptr;
     for (const FieldElement &field : output.fields) {
-        checkField(field, use, isTable);
+        checkField(field, variables, isTable);
     }
 }
 
-void Checker::checkField(const FieldElement &field, const QString &use, bool isTable)
+void Checker::checkField(const FieldElement &field, const QSet<QString> *variables, bool isTable)
 {
     const ScanElement &name = field.variableName;
     const qsizetype source = name.exists() ? name.source : field.element.source;
     const FieldMarker marker = fieldMarker(name.value.view());
-    if (marker == FieldMarker::None && !use.isEmpty() && !variables_.value(use).contains(foldedKey(name.value.view())))
-    {
+    if (marker == FieldMarker::None && variables != nullptr && !variables->contains(foldedKey(name.value.view()))) {
         error(source,
               isTable
                   ? Xlate("the dictionary has no variable %1: the column cannot be filled").arg(quoted(name))
@@ -255,25 +276,7 @@ void Checker::checkText(const ScanElement &element)
 void Checker::addNotes()
 {
     for (const ScanNote &note : notes_) {
-        const QString tag = bracketed(note.tag);
-        switch (note.kind) {
-        case ScanNote::Kind::EmptyEndsList:
-            error(note.source, Xlate("an empty %1 ends its list: what follows in the list is not read").arg(tag));
-            break;
-        case ScanNote::Kind::ClosedBeforeOpen:
-            error(note.source, Xlate("%1 is not read: a closing tag of that name stands before it").arg(tag));
-            break;
-        case ScanNote::Kind::Unclosed:
-            error(note.source, Xlate("%1 is not read: its closing tag was expected").arg(tag));
-            break;
-        case ScanNote::Kind::RunsOn:
-            error(note.source,
-                  Xlate("%1 stands in another %1: the outer one is cut short at the first closing tag").arg(tag));
-            break;
-        case ScanNote::Kind::ShortCloseDrops:
-            warning(note.source, Xlate("\"%1\" is dropped with the short closing tag of %2").arg(note.text, tag));
-            break;
-        }
+        remarks_.push_back({places_.of(note.source), isError(note), textOf(note)});
     }
 }
 
@@ -282,6 +285,18 @@ void Checker::addNotes()
 std::vector<TemplateRemark> checkTemplates(const TemplateFile &file)
 {
     return Checker(file).check();
+}
+
+std::optional<TemplateRemark> firstUnreadTemplate(const TemplateFile &file)
+{
+    ScanNotes notes;
+    readTemplateElements(file.scanText(), &notes);
+    for (const ScanNote &note : notes) {
+        if (note.tag == u"REPORTTEMPLATE" && isError(note)) {
+            return TemplateRemark{TextPlaces(file.text()).of(note.source), true, textOf(note)};
+        }
+    }
+    return std::nullopt;
 }
 
 } // namespace kareport

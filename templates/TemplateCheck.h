@@ -6,6 +6,7 @@
 
 #include <QString>
 
+#include <optional>
 #include <vector>
 
 namespace kareport
@@ -25,5 +26,8 @@ inline constexpr qint32 widestColumn = 32767;
 /// Reads every template of a file as the module reads it and says what the module passes over in silence, in the order
 /// of the file.
 KAREPORT_EXPORT std::vector<TemplateRemark> checkTemplates(const TemplateFile &file);
+
+/// The first thing in a file that keeps a whole template from being read; nothing when there is none.
+KAREPORT_EXPORT std::optional<TemplateRemark> firstUnreadTemplate(const TemplateFile &file);
 
 } // namespace kareport

@@ -6,8 +6,8 @@ namespace kareport
 namespace
 {
 
-/// Where the parts of a table or a block are cut out of, one after the other: each cut changes what the next one sees,
-/// so the order of the cuts belongs to the format.
+/// The parts of an element are cut out one after the other. Each cut changes what the next one sees, so the order of the
+/// cuts belongs to the format; the last one is only looked up, since nothing is read behind it.
 using FieldReader = FieldElement (*)(ScanElement element, ScanNotes *notes);
 
 FieldElement readTableField(ScanElement element, ScanNotes *notes)
@@ -18,7 +18,7 @@ FieldElement readTableField(ScanElement element, ScanNotes *notes)
     field.format = ExtractNode(rest, u"FORMAT", true, notes);
     field.label = ExtractNode(rest, u"LABEL", true, notes);
     field.align = ExtractNode(rest, u"ALIGN", true, notes);
-    field.variableName = ExtractNode(rest, u"VARIABLENAME", true, notes);
+    field.variableName = GetNode(rest, u"VARIABLENAME", notes);
     return field;
 }
 
@@ -30,7 +30,7 @@ FieldElement readBlockField(ScanElement element, ScanNotes *notes)
     field.variableName = ExtractNode(rest, u"VARIABLENAME", true, notes);
     field.label = ExtractNode(rest, u"LABEL", true, notes);
     field.format = ExtractNode(rest, u"FORMAT", true, notes);
-    field.align = ExtractNode(rest, u"ALIGN", true, notes);
+    field.align = GetNode(rest, u"ALIGN", notes);
     return field;
 }
 
@@ -44,7 +44,7 @@ std::vector<OutputElement> readOutputs(const ScanText &list, QStringView tag, Fi
         output.element = std::move(*element);
         output.name = ExtractNode(rest, u"NAME", true, notes);
         output.use = ExtractNode(rest, u"USE", true, notes);
-        const ScanElement outputList = ExtractNode(rest, u"OUTPUTLIST", true, notes);
+        const ScanElement outputList = GetNode(rest, u"OUTPUTLIST", notes);
         NodeSequence fields(outputList.value, u"FIELD", notes);
         while (auto field = fields.next()) {
             output.fields.push_back(readField(std::move(*field), notes));
@@ -65,7 +65,7 @@ std::vector<TemplateElement> readTemplateElements(const ScanText &file, ScanNote
         TemplateElement found;
         found.body = std::move(*element);
         found.name = ExtractNode(rest, u"NAME", true, notes);
-        found.title = ExtractNode(rest, u"TITLE", true, notes);
+        found.title = GetNode(rest, u"TITLE", notes);
         templates.push_back(std::move(found));
     }
     return templates;
@@ -91,7 +91,7 @@ std::vector<SortElement> readSortElements(const ScanText &body, ScanNotes *notes
         SortElement sort;
         sort.name = ExtractNode(rest, u"NAME", true);
         sort.use = ExtractNode(rest, u"USE", true);
-        const ScanElement list = ExtractNode(rest, u"SORT", true, notes);
+        const ScanElement list = GetNode(rest, u"SORT", notes);
         NodeSequence names(list.value, u"VARIABLENAME", notes);
         while (auto name = names.next()) {
             sort.variableNames.push_back(std::move(*name));
@@ -113,7 +113,7 @@ std::vector<DictionaryElement> readDictionaryElements(const ScanText &body, Scan
         DictionaryElement dictionary;
         dictionary.element = std::move(*element);
         dictionary.name = ExtractNode(rest, u"DICTIONARYNAME", true, notes);
-        const ScanElement variables = ExtractNode(rest, u"VARIABLELIST", true, notes);
+        const ScanElement variables = GetNode(rest, u"VARIABLELIST", notes);
         NodeSequence variableSequence(variables.value, u"VARIABLE", notes);
         while (auto variable = variableSequence.next()) {
             ScanText parts = variable->value;
@@ -121,7 +121,7 @@ std::vector<DictionaryElement> readDictionaryElements(const ScanText &body, Scan
             read.element = std::move(*variable);
             read.id = ExtractNode(parts, u"ID", true, notes);
             read.variableName = ExtractNode(parts, u"VARIABLENAME", true, notes);
-            read.type = ExtractNode(parts, u"TYPE", true, notes);
+            read.type = GetNode(parts, u"TYPE", notes);
             dictionary.variables.push_back(std::move(read));
         }
         dictionaries.push_back(std::move(dictionary));

@@ -13,7 +13,8 @@ class KAREPORT_EXPORT UXmlReportTable
 {
 public:
     /// Points to the table of a name and its dictionary, sort keys and options, and builds the heading.
-    /// @return false, and points to nothing, for a null template, an unknown table or one whose dictionary is missing
+    /// @return false, and points to nothing, for a null template, an unknown table or one whose dictionary is missing; the
+    ///         heading then stays as it was, as it does for a table without fields
     bool LoadTable(const QString &tableName, const UXmlReportTpl *reportTemplate);
 
     /// Whether the handle points to a table.
@@ -24,7 +25,8 @@ public:
     /// 0 when no table is loaded.
     int GetFieldsCount() const;
 
-    /// The labels, each filled to its column's width, with the separator between them.
+    /// The labels, each filled with up to 98 blanks to its column's width, with the separator between them; joined by
+    /// tabs alone where the separator is a tab. No separator follows a marker field.
     QString GetHeading() const { return Heading; }
     /// Builds the heading again, after the template's columns were put into another order.
     void ReorderingHeading();

@@ -157,12 +157,23 @@ void UXmlReportTpl::ReadSortData()
 bool UXmlReportTpl::FindVariable(const QString &dictionaryName, const QString &variableName, qint32 &id,
                                  qint32 &type) const
 {
-    const auto dictionary = variables_.constFind(foldedKey(dictionaryName));
-    if (dictionary == variables_.constEnd()) {
+    return GetDicInfo(variablesOf(dictionaryName), variableName, id, type);
+}
+
+/// The variables of all dictionaries of a name; null when there is none.
+const UXmlReportTpl::Variables *UXmlReportTpl::variablesOf(const QString &dictionaryName) const
+{
+    const auto found = variables_.constFind(foldedKey(dictionaryName));
+    return found == variables_.constEnd() ? nullptr : &*found;
+}
+
+bool UXmlReportTpl::GetDicInfo(const Variables *variables, const QString &variableName, qint32 &id, qint32 &type)
+{
+    if (variables == nullptr) {
         return false;
     }
-    const auto variable = dictionary->constFind(foldedKey(variableName));
-    if (variable == dictionary->constEnd()) {
+    const auto variable = variables->constFind(foldedKey(variableName));
+    if (variable == variables->constEnd()) {
         return false;
     }
     id = variable->id;
@@ -173,10 +184,11 @@ bool UXmlReportTpl::FindVariable(const QString &dictionaryName, const QString &v
 void UXmlReportTpl::MergeTableWithDictionary()
 {
     for (sXmlReportTable &table : tables_) {
+        const Variables *variables = variablesOf(table.Use);
         for (sXmlReportField &field : table.Fields) {
             field.ID = 0;
             field.Type = 0;
-            GetDicInfo(table.Use, field.VariableName, field.ID, field.Type);
+            GetDicInfo(variables, field.VariableName, field.ID, field.Type);
         }
     }
 }
@@ -188,8 +200,9 @@ void UXmlReportTpl::MergeBlockWithDictionary()
     qint32 id = 0;
     qint32 type = 0;
     for (sXmlReportBlock &block : blocks_) {
+        const Variables *variables = variablesOf(block.Use);
         for (sXmlReportField &field : block.Fields) {
-            GetDicInfo(block.Use, field.VariableName, id, type);
+            GetDicInfo(variables, field.VariableName, id, type);
             field.ID = id;
             field.Type = type;
         }
@@ -201,8 +214,9 @@ void UXmlReportTpl::MergeSortWithDictionary()
     qint32 id = 0;
     qint32 type = 0;
     for (sXmlSortTableReport &list : sortLists_) {
+        const Variables *variables = variablesOf(list.Use);
         for (sXmlSortVariable &entry : list.Entries) {
-            GetDicInfo(list.Use, entry.VariableName, id, type);
+            GetDicInfo(variables, entry.VariableName, id, type);
             entry.ID = static_cast<quint32>(id);
         }
     }
@@ -228,8 +242,12 @@ void UXmlReportTpl::CleanData(bool keepText)
 
 QString UXmlReportTpl::GetTemplateTitle() const
 {
-    const auto *info = findByName(templates_, &sXmlReportTemplateInfo::Name, name_);
-    return info != nullptr ? info->Title : QString();
+    for (const auto &info : templates_) {
+        if (equalFolded(info.Name, name_)) {
+            return info.Title;
+        }
+    }
+    return QString();
 }
 
 void UXmlReportTpl::GetAllTPLsByName(QStringList &names) const
@@ -298,7 +316,7 @@ bool UXmlReportTpl::SetNorthEastTableFieldOrder(const QString &tableName, ORIENT
             continue;
         }
         const bool isFirst = northing == nullptr && easting == nullptr;
-        if (isFirst && isNorthing == (order == ORDER_NORTHING_EASTING)) {
+        if (isFirst && order == (isNorthing ? ORDER_NORTHING_EASTING : ORDER_EASTING_NORTHING)) {
             return true;
         }
         (isNorthing ? northing : easting) = &field;

@@ -33,7 +33,7 @@ public:
     ///         holds nothing, the list of templates included.
     bool LoadTemplate(const QString &fileName, const QString &templateName);
 
-    /// The title of the chosen template: of several with its name, the first one's; "" when nothing is loaded.
+    /// The title of the chosen template: of several with its name, the first one's; "" when no template has the name.
     QString GetTemplateTitle() const;
 
     // Each replaces the content of the list that it fills.
@@ -76,10 +76,6 @@ private:
     void MergeTableWithDictionary();
     void MergeBlockWithDictionary();
     void MergeSortWithDictionary();
-    void GetDicInfo(const QString &dictionaryName, const QString &variableName, qint32 &id, qint32 &type) const
-    {
-        FindVariable(dictionaryName, variableName, id, type);
-    }
     void CleanData(bool keepText);
 
     struct VariableInfo
@@ -87,6 +83,10 @@ private:
         qint32 id;
         qint32 type;
     };
+    using Variables = QHash<QString, VariableInfo>; ///< by their folded names; of several with one name, the last
+
+    const Variables *variablesOf(const QString &dictionaryName) const;
+    static bool GetDicInfo(const Variables *variables, const QString &variableName, qint32 &id, qint32 &type);
 
     kareport::ScanText xml_; ///< after loading, the body of the chosen template
     QString name_;
@@ -99,8 +99,7 @@ private:
     std::vector<sXmlReportTemplateInfo> templates_;
     std::vector<sXmlSortTableReport> sortLists_;
     sXmlReportOption option_;
-    /// The variables by the folded names of their dictionary and their own; of several with one name, the last.
-    QHash<QString, QHash<QString, VariableInfo>> variables_;
+    QHash<QString, Variables> variables_; ///< by the folded name of their dictionaries
 
     friend class UXmlReportTplTest;
 };

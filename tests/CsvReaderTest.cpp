@@ -52,7 +52,11 @@ TEST(CsvReader, ReadsRowsAndCells)
         {"a,b\r\n1,2\r\n", ',', {{"a", "b"}, {"1", "2"}}, "rows that end with CR LF"},
         {"a,b\n1,2", ',', {{"a", "b"}, {"1", "2"}}, "the last row without a line end"},
         {"a,b\r\n1,2\n3,4", ',', {{"a", "b"}, {"1", "2"}, {"3", "4"}}, "both line ends in one file"},
-        {"\xEF\xBB\xBF" "a,b", ',', {{"a", "b"}}, "a byte-order mark is no part of the first cell"},
+        {"\xEF\xBB\xBF"
+         "a,b",
+         ',',
+         {{"a", "b"}},
+         "a byte-order mark is no part of the first cell"},
         {"\xEF\xBB\xBF\"a\",b", ',', {{"a", "b"}}, "a quoted cell behind a byte-order mark"},
         {",", ',', {{"", ""}}, "two empty cells"},
         {"a,,b,\n", ',', {{"a", "", "b", ""}}, "empty cells, the last one too"},
@@ -70,8 +74,13 @@ TEST(CsvReader, ReadsRowsAndCells)
         {"a\tb,c\n", '\t', {{"a", "b,c"}}, "tabs between; the comma is none"},
         {"a;\"b;c\";1,5\n", ';', {{"a", "b;c", "1,5"}}, "semicolons between"},
         {"a b\n", ' ', {{"a", "b"}}, "blanks between"},
-        {"Gr\xC3\xB6\xC3\x9F" "e,\xE6\xB8\xAC,\xF0\x9D\x84\x9E", ',',
-         {{"Gr\xC3\xB6\xC3\x9F" "e", "\xE6\xB8\xAC", "\xF0\x9D\x84\x9E"}}, "UTF-8 of two, three and four bytes"},
+        {"Gr\xC3\xB6\xC3\x9F"
+         "e,\xE6\xB8\xAC,\xF0\x9D\x84\x9E",
+         ',',
+         {{"Gr\xC3\xB6\xC3\x9F"
+           "e",
+           "\xE6\xB8\xAC", "\xF0\x9D\x84\x9E"}},
+         "UTF-8 of two, three and four bytes"},
         {"a\n\n\n\r\n", ',', {{"a"}}, "blank lines at the end are no rows"},
         {"a,b\n\n1,2", ',', {{"a", "b"}, {""}, {"1", "2"}}, "a blank line inside is a row of one empty cell"},
         {"\n\na", ',', {{""}, {""}, {"a"}}, "blank lines at the beginning"},
@@ -110,20 +119,28 @@ TEST(CsvReader, EveryMistakeHasItsPlace)
         {"\"a\0\""sv, "1:3", "zero byte", "a zero byte in quotes"},
         {"a\rb"sv, "1:2", "line feed", "a carriage return alone"},
         {"ab\xFF"sv, "1:3", "not UTF-8", "a byte that is never UTF-8"},
-        {"Gr\xF6\xDF" "e"sv, "1:3", "not UTF-8", "Latin-1"},
+        {"Gr\xF6\xDF"
+         "e"sv,
+         "1:3", "not UTF-8", "Latin-1"},
         {"a,b\n1,\xE4\n"sv, "2:3", "not UTF-8", "Latin-1 in the second row"},
         {"\xC3\xA4\xC3"sv, "1:2", "not UTF-8", "cut off in the middle of a character"},
         {"x\xC0\x80"sv, "1:2", "not UTF-8", "an overlong zero"},
         {"x\xED\xA0\x80"sv, "1:2", "not UTF-8", "half a surrogate pair"},
         {"x\xF4\x90\x80\x80"sv, "1:2", "not UTF-8", "beyond the last character"},
         {"\"a\nb\xFF\""sv, "2:2", "not UTF-8", "in the second line of a quoted cell"},
-        {"\xEF\xBB\xBF" "a\xFF"sv, "1:2", "not UTF-8", "behind a byte-order mark"},
-        {"\xFF\xFE" "N\0,\0E\0"sv, "1:4", "", "UTF-16"},
+        {"\xEF\xBB\xBF"
+         "a\xFF"sv,
+         "1:2", "not UTF-8", "behind a byte-order mark"},
+        {"\xFF\xFE"
+         "N\0,\0E\0"sv,
+         "1:4", "", "UTF-16"},
         {"\"x\ny\",z\nq\""sv, "3:2", "quote", "the row behind one of two lines"},
         {"\"x\ny\",z\""sv, "2:5", "quote", "the second line of a row"},
         {"\"x\r\ny\",z\""sv, "2:5", "quote", "the second line of a row, with CR LF"},
         {"\xF0\x9D\x84\x9E\xE6\xB8\xAC,a\""sv, "1:5", "quote", "columns count characters, not bytes"},
-        {"\xEF\xBB\xBF" "a\""sv, "1:2", "quote", "a byte-order mark takes no column"},
+        {"\xEF\xBB\xBF"
+         "a\""sv,
+         "1:2", "quote", "a byte-order mark takes no column"},
     };
     for (const Row &row : rows) {
         CsvReader reader(file, row.bytes, ',');

@@ -16,6 +16,7 @@
 
 #include <algorithm>
 #include <memory>
+#include <string>
 #include <vector>
 
 /// What happens to the documents and panes of one test. It outlives them, and closes the panes that a test leaves open.
@@ -190,10 +191,10 @@ public:
     std::vector<MessageButtons> asked;
 };
 
-inline QByteArray contentOf(const QString &path)
+inline std::string contentOf(const QString &path)
 {
     QFile file(path);
-    return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray("(cannot be read)");
+    return file.open(QIODevice::ReadOnly) ? file.readAll().toStdString() : "(cannot be read)";
 }
 
 inline void putFile(const QString &path, const QByteArray &content)

@@ -46,12 +46,14 @@ TEST(Golden, EveryExampleComesOutByteForByte)
         const auto error = runner.run();
         ASSERT_FALSE(error) << qPrintable(error->message());
         for (const auto &[kind, ending] : {std::pair(kareport::OutputKind::Report, QStringLiteral(".rep")),
-                                           std::pair(kareport::OutputKind::Text, QStringLiteral(".txt"))}) {
+                                           std::pair(kareport::OutputKind::Text, QStringLiteral(".txt"))})
+        {
             const QString file = name.chopped(5) + ending;
             ASSERT_FALSE(kareport::writeOutput(runner.report(), {folder.filePath(file), kind})) << qPrintable(file);
             const QByteArray expected = contentOf(goldens.filePath(file));
             const QByteArray made = contentOf(folder.filePath(file));
-            EXPECT_TRUE(made == expected) << qPrintable(file) << " differs from line " << firstDifference(made, expected);
+            EXPECT_TRUE(made == expected)
+                << qPrintable(file) << " differs from line " << firstDifference(made, expected);
         }
     }
 }

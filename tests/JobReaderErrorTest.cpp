@@ -30,9 +30,11 @@ void expectErrors(const Row (&rows)[count])
         ASSERT_TRUE(source.failed()) << row.reason << ": " << row.job;
         const QString message = source.error()->message();
         EXPECT_TRUE(message.startsWith(QStringLiteral("job.json:%1: error: ").arg(marked.place)))
-            << row.reason << ": " << row.job << "\n" << message.toStdString();
+            << row.reason << ": " << row.job << "\n"
+            << message.toStdString();
         EXPECT_TRUE(source.error()->text.contains(QString::fromUtf8(row.contains)))
-            << row.reason << ": " << row.job << "\n" << message.toStdString();
+            << row.reason << ": " << row.job << "\n"
+            << message.toStdString();
         EXPECT_FALSE(message.contains(u'\n')) << row.reason;
     }
 }
@@ -56,7 +58,8 @@ TEST(JobReaderError, OfTheJobItself)
         {R"({"report": [], "now": @"yesterday"})", "2024-03-05T14:07:00", "no time"},
         {R"({"report": [], "now": @"2024-02-30T00:00:00"})", "2024-03-05T14:07:00", "no such day"},
         {R"({"report": [], "now": @""})", "2024-03-05T14:07:00", "an empty text"},
-        {"{\"report\": [],\r\n  \"title\": \"Gr\xC3\xB6\xC3\x9F" "e \xF0\x9D\x84\x9E\", \"header\": @0}",
+        {"{\"report\": [],\r\n  \"title\": \"Gr\xC3\xB6\xC3\x9F"
+         "e \xF0\x9D\x84\x9E\", \"header\": @0}",
          "true or false was expected", "columns count characters"},
         {"\xEF\xBB\xBF{\"report\": [], \"header\": @0}", "true or false was expected", "behind a byte-order mark"},
     };

@@ -54,7 +54,7 @@ constexpr Row rows[] = {
     {u"<!-- <Title>", Kind::InComment, 5, u"<Title>", "a comment without an end"},
     {u"<!-- --> <Name >", Kind::NotATag, 9, u"<Name >", "a blank in a tag behind a comment"},
     {u"<Label abcdefghijklmnopqrstuvwxyz0123456789abcdef>", Kind::NotATag, 0,
-     u"<Label abcdefghijklmnopqrstuvwxyz0123456…>", "a long tag is quoted by its first 40 characters"},
+     u"<Label abcdefghijklmnopqrstuvwxyz01234567…>", "a long tag is quoted by its first 40 characters"},
 };
 
 TEST(TagLint, FindsWhatLooksLikeATagAndIsNone)

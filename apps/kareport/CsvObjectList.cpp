@@ -4,7 +4,7 @@
 #include "TemplateText.h"
 #include "Xlate.h"
 
-#include <QSet>
+#include <QHash>
 
 #include <algorithm>
 #include <numeric>
@@ -42,18 +42,26 @@ void CsvObjectList::readHeader(const FindVariable &findVariable)
                                  : reader_.errorAt(TextPlace(), Xlate("a header row of variable names was expected"));
         return;
     }
-    QSet<QString> names;
+    QHash<QString, bool> names; // and whether the dictionary knows them
+    bool anyKnown = false;
     for (std::size_t i = 0; i < reader_.cells().size(); ++i) {
         const std::string_view cell = reader_.cells()[i];
         const QString name = QString::fromUtf8(cell.data(), static_cast<qsizetype>(cell.size()));
-        if (names.contains(foldedKey(name))) {
-            error_ =
-                reader_.errorAt(reader_.placeOfCell(i),
-                                Xlate("the column \"%1\" stands twice: each variable was expected once").arg(name));
+        const bool known = columns_.emplace_back(Column{name, findVariable(name)}).parser.has_value();
+        anyKnown |= known;
+        const auto earlier = names.constFind(foldedKey(name));
+        if (earlier != names.constEnd() && (known || *earlier)) {
+            error_ = reader_.errorAt(reader_.placeOfCell(i),
+                                     Xlate("the column \"%1\" stands twice: each variable was expected once").arg(name));
             return;
         }
-        names.insert(foldedKey(name));
-        columns_.push_back({name, findVariable(name)});
+        names.insert(foldedKey(name), known);
+    }
+    if (!anyKnown) {
+        error_ = reader_.errorAt(
+            reader_.placeOfCell(0),
+            Xlate("no column of the header row is a variable of the dictionary: a header row of variable "
+                  "names, with the data's delimiter between them, was expected"));
     }
 }
 
@@ -63,7 +71,10 @@ UDataObject *CsvObjectList::GetAt(std::size_t index)
         return nullptr;
     }
     if (batch_ == nullptr || index < batchStart_) {
-        start();
+        static const RowBatch nothing;
+        rewind();
+        batch_ = &nothing;
+        batches_ = std::make_unique<RowBatches>([this](RowBatch &batch) { fill(batch); });
     }
     while (index - batchStart_ >= batch_->count) {
         if (!takeBatch()) {
@@ -73,17 +84,15 @@ UDataObject *CsvObjectList::GetAt(std::size_t index)
     return const_cast<UDataObject *>(&batch_->objects[index - batchStart_]);
 }
 
-/// Begins to read at the first row.
-void CsvObjectList::start()
+/// Goes back to the first row, with no batch read.
+void CsvObjectList::rewind()
 {
-    static const RowBatch nothing;
     batches_.reset();
     reader_.seek(firstRow_.start, firstRow_.line);
     nextOrdered_ = 0;
     error_.reset();
-    batch_ = &nothing;
+    batch_ = nullptr;
     batchStart_ = 0;
-    batches_ = std::make_unique<RowBatches>([this](RowBatch &batch) { fill(batch); });
 }
 
 /// Goes on to the next batch. @return false when there is none
@@ -101,13 +110,16 @@ bool CsvObjectList::takeBatch()
 
 void CsvObjectList::fill(RowBatch &batch)
 {
-    while (batch.count < RowBatch::most && !batch.isLast) {
+    std::size_t bytes = 0;
+    while (batch.count < RowBatch::most && bytes < RowBatch::mostBytes && !batch.isLast) {
         batch.isLast = !readRow(batch);
+        bytes += reader_.position() - reader_.rowStart();
     }
     batch.position = reader_.position();
 }
 
-bool CsvObjectList::readRow(RowBatch &batch)
+/// Goes to the next row of a sorted list. @return false behind the last one
+bool CsvObjectList::seekNext()
 {
     if (order_) {
         if (nextOrdered_ == order_->size()) {
@@ -115,6 +127,14 @@ bool CsvObjectList::readRow(RowBatch &batch)
         }
         const RowPlace &place = (*order_)[nextOrdered_++];
         reader_.seek(place.start, place.line);
+    }
+    return true;
+}
+
+bool CsvObjectList::readRow(RowBatch &batch)
+{
+    if (!seekNext()) {
+        return false;
     }
     if (!reader_.next()) {
         batch.error = reader_.error();
@@ -155,17 +175,15 @@ void CsvObjectList::Sort(const std::vector<unsigned> &ids)
     if (error_) {
         return;
     }
+    // The rows are read in the order that they have, so that equal ones keep it.
+    rewind();
     struct Key
     {
         UDataObject values;
         RowPlace place;
     };
     std::vector<Key> keys;
-    batches_.reset();
-    batch_ = nullptr;
-    order_.reset();
-    reader_.seek(firstRow_.start, firstRow_.line);
-    while (reader_.next()) {
+    while (seekNext() && reader_.next()) {
         if (progress_ && keys.size() % RowBatch::most == 0 && !progress_(reader_.position())) {
             stopped_ = true;
             return;

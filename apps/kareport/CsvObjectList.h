@@ -47,8 +47,9 @@ private:
     };
 
     void readHeader(const FindVariable &findVariable);
-    void start();
+    void rewind();
     void fill(RowBatch &batch);
+    bool seekNext();
     bool readRow(RowBatch &batch);
     bool takeBatch();
     std::optional<InputError> storeCells(UDataObject &object, const std::vector<unsigned> *onlyIds) const;

@@ -19,6 +19,8 @@ enum ByteClass : unsigned char
     special ///< ends a cell or stands nowhere in a plain one
 };
 
+/// What is read into memory from a pipe or a device, which may never end.
+constexpr qint64 largestUnmapped = qint64(1) << 30;
 constexpr std::string_view byteOrderMark = "\xEF\xBB\xBF";
 
 bool isUtf8(std::string_view text)
@@ -34,16 +36,20 @@ Expected<std::shared_ptr<const FileBytes>> FileBytes::open(const QString &path)
     bytes->path_ = path;
     bytes->file_.setFileName(path);
     if (!bytes->file_.open(QIODevice::ReadOnly)) {
-        return InputError{path, std::nullopt, Xlate("the file cannot be read: %1").arg(bytes->file_.errorString())};
+        return InputError{path, std::nullopt, bytes->file_.errorString()};
     }
     const qint64 size = bytes->file_.size();
     if (const uchar *mapped = size > 0 ? bytes->file_.map(0, size) : nullptr) {
         bytes->view_ = {reinterpret_cast<const char *>(mapped), static_cast<std::size_t>(size)};
         return std::shared_ptr<const FileBytes>(std::move(bytes));
     }
-    bytes->content_ = bytes->file_.readAll();
+    bytes->content_ = bytes->file_.read(largestUnmapped + 1);
+    if (bytes->content_.size() > largestUnmapped) {
+        return InputError{path, TextPlace(),
+                          Xlate("more than %1 MB come out of what is no file").arg(largestUnmapped >> 20)};
+    }
     if (bytes->file_.error() != QFileDevice::NoError) {
-        return InputError{path, std::nullopt, Xlate("the file cannot be read: %1").arg(bytes->file_.errorString())};
+        return InputError{path, std::nullopt, bytes->file_.errorString()};
     }
     bytes->view_ = {bytes->content_.constData(), static_cast<std::size_t>(bytes->content_.size())};
     return std::shared_ptr<const FileBytes>(std::move(bytes));
@@ -110,7 +116,7 @@ bool CsvReader::skipEmptyEnd()
 
 bool CsvReader::scanRow()
 {
-    const std::size_t limit = std::min(bytes_.size(), rowStart_ + longestRow);
+    const std::size_t limit = std::min(bytes_.size(), rowStart_ + longestRow + 1); // with its line end
     std::size_t cellStart = position_;
     std::size_t at = position_;
     while (at < limit) {
@@ -147,8 +153,8 @@ bool CsvReader::scanRow()
             return fail(at, Xlate("a zero byte stands in the file: a text file was expected"));
         }
     }
-    if (at < bytes_.size()) {
-        return fail(rowStart_, Xlate("the line is longer than %1 bytes: a table of rows was expected").arg(longestRow));
+    if (at - rowStart_ > longestRow) {
+        return failTooLong();
     }
     rawCells_.push_back({cellStart, at, false, false});
     return endRow(at);
@@ -178,7 +184,7 @@ bool CsvReader::scanQuoted(std::size_t limit)
         }
         hasHighBytes_ |= static_cast<unsigned char>(character) >= 0x80;
     }
-    return fail(opening, Xlate("the quoted cell has no closing quote"));
+    return limit < bytes_.size() ? failTooLong() : fail(opening, Xlate("the quoted cell has no closing quote"));
 }
 
 bool CsvReader::endRow(std::size_t end)
@@ -236,6 +242,11 @@ TextPlace CsvReader::placeOfCell(std::size_t cell) const
 {
     const RawCell &raw = rawCells_[std::min(cell, rawCells_.size() - 1)];
     return placeOf(raw.quoted ? raw.begin - 1 : raw.begin);
+}
+
+bool CsvReader::failTooLong()
+{
+    return fail(rowStart_, Xlate("the row is longer than %1 bytes: a table of rows was expected").arg(longestRow));
 }
 
 bool CsvReader::fail(std::size_t at, const QString &text)

@@ -76,6 +76,7 @@ private:
     bool endRow(std::size_t end);
     void takeCells();
     bool skipEmptyEnd();
+    bool failTooLong();
     bool fail(std::size_t at, const QString &text);
     TextPlace placeOf(std::size_t at) const;
 

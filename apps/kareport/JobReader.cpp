@@ -239,7 +239,7 @@ std::vector<Job::Step> readSteps(const JsonNode &node, const Job &job)
     return steps;
 }
 
-std::optional<Output> readOutput(const JsonNode &node, const QDir &folder)
+std::optional<Output> readOutput(const JsonNode &node, const QDir &folder, std::optional<OutputKind> otherwise)
 {
     if (node.value().isObject()) {
         node.allowOnly({"file", "as"});
@@ -251,7 +251,7 @@ std::optional<Output> readOutput(const JsonNode &node, const QDir &folder)
     }
     const QString name = file.text();
     const JsonNode as = node["as"];
-    const auto kind = as.exists() ? outputKindFromName(as.text()) : outputKindFromFile(name);
+    const auto kind = as.exists() ? outputKindFromName(as.text()) : outputKindOf(name, otherwise);
     if (!kind && as.exists()) {
         as.fail(Xlate("one of %1 was expected").arg(outputKindNames()));
         return std::nullopt;
@@ -266,7 +266,7 @@ std::optional<Output> readOutput(const JsonNode &node, const QDir &folder)
 
 } // namespace
 
-Job readJob(JsonSource &source)
+Job readJob(JsonSource &source, std::optional<OutputKind> kindOtherwise)
 {
     const JsonNode root(source);
     const QDir folder = source.path().isEmpty() ? QDir::current() : QFileInfo(source.path()).absoluteDir();
@@ -285,7 +285,11 @@ Job readJob(JsonSource &source)
     }
     job.header = root["header"].boolean(true);
     if (const JsonNode now = root["now"]; now.exists()) {
-        job.now = QDateTime::fromString(now.text(), Qt::ISODate);
+        // The hands of a clock, without a zone: a time that a zone's summer time leaves out is one all the same.
+        job.now = QDateTime::fromString(now.text() + u'Z', Qt::ISODate);
+        if (!job.now->isValid()) {
+            job.now = QDateTime::fromString(now.text(), Qt::ISODate);
+        }
         if (!job.now->isValid()) {
             now.fail(Xlate("a date and time such as 2024-03-05T14:07:00 was expected"));
         }
@@ -306,7 +310,7 @@ Job readJob(JsonSource &source)
     job.steps = readSteps(root["report"], job);
     if (const JsonNode outputs = root["output"]; outputs.expectArray()) {
         for (qsizetype i = 0; i < outputs.size(); ++i) {
-            if (const auto output = readOutput(outputs[i], folder)) {
+            if (const auto output = readOutput(outputs[i], folder, kindOtherwise)) {
                 job.outputs.push_back(*output);
             }
         }

@@ -7,7 +7,8 @@ namespace kareport
 {
 
 /// Reads a job file's content. What is wrong with it fails the source; the job that comes back then is no use.
-Job readJob(JsonSource &source);
+/// @param kindOtherwise  the kind of outputs whose names do not say it
+Job readJob(JsonSource &source, std::optional<OutputKind> kindOtherwise = std::nullopt);
 
 /// Reads the host's settings by their keys.
 UJobSettings readSettings(const JsonNode &node);

@@ -10,6 +10,7 @@
 #include "Profile.h"
 #include "ReportEntry.h"
 #include "ReportMargins.h"
+#include "TemplateCheck.h"
 #include "TemplateSource.h"
 #include "Xlate.h"
 
@@ -65,10 +66,13 @@ public:
             return;
         }
         const auto list = openData(step.data, block->Use, true);
-        const UDataObject *object = list ? list->GetAt(0) : nullptr;
-        if (!takeError(list.get()) && list && object == nullptr) {
-            runner_.source_.fail(path_,
-                                 Xlate("the data \"%1\" has no row: a block shows the first one").arg(step.data));
+        // All rows must be good, though only the first one is shown.
+        for (std::size_t row = 0; list && list->GetAt(row) != nullptr; ++row) {
+        }
+        const bool isGood = list && !takeError(list.get());
+        const UDataObject *object = isGood ? list->GetAt(0) : nullptr;
+        if (isGood && object == nullptr && !isInterrupted()) {
+            failWithoutRow(step.data);
         }
         if (object != nullptr && !failed()) {
             report_.WriteDataBlock(step.name, object, step.before, step.after);
@@ -111,6 +115,16 @@ private:
                                      .arg(what, name, record->Use));
             return false;
         }
+        for (const sXmlReportField &field : record->Fields) {
+            if (field.Width > widestColumn || field.Width < -widestColumn || field.Decimals > widestColumn) {
+                runner_.source_.fail(
+                    path_, Xlate("the %1 \"%2\" cannot be written: the format of its field \"%3\" is beyond %4 "
+                                 "characters")
+                               .arg(what, name, field.VariableName)
+                               .arg(widestColumn));
+                return false;
+            }
+        }
         return true;
     }
 
@@ -128,17 +142,23 @@ private:
             }
             return ValueParser(type, static_cast<unsigned>(id), set.units);
         };
-        return set.csv.isEmpty() ? readValues(name, findVariable, firstOnly) : openCsv(set, findVariable);
+        return set.csv.isEmpty() ? readValues(name, findVariable, firstOnly) : openCsv(name, set, findVariable);
     }
 
-    std::unique_ptr<UDataObjectList> openCsv(const Job::DataSet &set, const FindVariable &findVariable)
+    std::unique_ptr<UDataObjectList> openCsv(const QString &name, const Job::DataSet &set,
+                                             const FindVariable &findVariable)
     {
-        auto file = FileBytes::open(set.csv);
-        if (const InputError *error = errorOf(file)) {
-            error_ = *error;
-            return nullptr;
+        // A pipe can be read once only: its bytes serve every step.
+        auto &bytes = files_[set.csv];
+        if (!bytes) {
+            auto file = FileBytes::open(set.csv);
+            if (const InputError *error = errorOf(file)) {
+                JsonNode(runner_.source_)["data"][name]["csv"].fail(
+                    Xlate("the data file \"%1\" cannot be read: %2").arg(set.csv, error->text));
+                return nullptr;
+            }
+            bytes = std::get<std::shared_ptr<const FileBytes>>(file);
         }
-        const auto &bytes = std::get<std::shared_ptr<const FileBytes>>(file);
         Progress &progress = runner_.progress_;
         progress.begin(Xlate("Reading %1").arg(QFileInfo(set.csv).fileName()), bytes->view().size());
         return std::make_unique<CsvObjectList>(bytes, set.delimiter, findVariable, [&progress](std::size_t read) {
@@ -161,6 +181,17 @@ private:
         return list;
     }
 
+    void failWithoutRow(const QString &data)
+    {
+        const QString &csv = runner_.job_.data.constFind(data)->csv;
+        if (csv.isEmpty()) {
+            runner_.source_.fail(path_, Xlate("the data \"%1\" has no row: a block shows the first one").arg(data));
+        } else {
+            error_ = InputError{csv, TextPlace(),
+                                Xlate("a row was expected behind the header row: a block shows the first one")};
+        }
+    }
+
     bool takeError(UDataObjectList *list)
     {
         const auto *csv = dynamic_cast<const CsvObjectList *>(list);
@@ -174,6 +205,7 @@ private:
     UReportDoc &report_;
     JsonPath path_;
     std::optional<InputError> error_;
+    QHash<QString, std::shared_ptr<const FileBytes>> files_; ///< by their paths
 };
 
 JobRunner::JobRunner(const Job &job, JsonSource &source, Progress &progress)
@@ -251,11 +283,15 @@ std::optional<InputError> JobRunner::loadTemplate()
     const QString own = QDir(job_.folder).filePath(job_.reportTemplate->file);
     const QString installed = QDir(GetLibraryDir(false)).filePath(job_.reportTemplate->file);
     const QString path = QFileInfo::exists(own) || !QFileInfo::exists(installed) ? own : installed;
+    const QFileInfo info(path);
+    if (!info.isFile()) {
+        JsonNode(source_)["template"]["file"].fail(Xlate("there is no template file \"%1\"").arg(path));
+        return source_.error();
+    }
     const auto file = readTemplateSource(path);
     if (const InputError *error = errorOf(file)) {
         return *error;
     }
-    const QFileInfo info(path);
     setLibraryDir(info.absolutePath());
     setStartPathName(info.absolutePath());
     const bool loaded = report_->LoadTemplateXml(info.fileName(), job_.reportTemplate->name, QString(), QString());

@@ -17,6 +17,9 @@ namespace kareport
 namespace
 {
 
+/// A larger file is taken for something else.
+constexpr qint64 largestJob = qint64(256) << 20;
+
 QString withDots(const JsonPath &path)
 {
     QStringList steps;
@@ -79,7 +82,12 @@ Expected<JsonSource> JsonSource::read(const QString &path)
     if (!file.open(QIODevice::ReadOnly)) {
         return InputError{path, std::nullopt, Xlate("the file cannot be read: %1").arg(file.errorString())};
     }
-    return fromBytes(path, file.readAll());
+    const QByteArray bytes = file.read(largestJob + 1);
+    if (bytes.size() > largestJob) {
+        return InputError{path, TextPlace(),
+                          Xlate("the file is larger than %1 MB: a job was expected").arg(largestJob >> 20)};
+    }
+    return fromBytes(path, bytes);
 }
 
 Expected<JsonSource> JsonSource::fromBytes(const QString &path, const QByteArray &bytes)
@@ -115,6 +123,7 @@ std::optional<QString> JsonSource::set(const QString &key, const QString &text)
         return Xlate("there is no place for the key \"%1\" in the job").arg(key);
     }
     root_ = *changed;
+    setTexts_.removeIf([inside = key + u'.'](const auto &given) { return given.key().startsWith(inside); });
     setTexts_.insert(key, text);
     return std::nullopt;
 }
@@ -130,8 +139,15 @@ void JsonSource::fail(const JsonPath &path, const QString &text, bool atKey)
     if (error_) {
         return;
     }
-    if (const auto given = setText(path)) {
-        error_ = InputError{QStringLiteral("--set %1=%2").arg(withDots(path), *given), std::nullopt, text};
+    // What was set on the command line is not the file's fault.
+    for (JsonPath given = path; !given.empty(); given.pop_back()) {
+        if (const auto set = setText(given)) {
+            error_ = InputError{QStringLiteral("--set %1=%2").arg(withDots(given), *set), std::nullopt, text};
+            return;
+        }
+    }
+    if (bytes_.isEmpty()) {
+        error_ = InputError{path_, std::nullopt, text};
         return;
     }
     // What is missing is missed where its parent stands.

@@ -65,6 +65,8 @@ public:
     QStringList keys() const;
 
     bool isText() const;
+    /// The text that was set on the command line in the value's place, if any.
+    std::optional<QString> givenText() const { return source_.setText(path_); }
     bool isObject() const { return value_.isObject(); }
     QString text(const QString &fallback = QString()) const;
     bool boolean(bool fallback) const;

@@ -1,6 +1,9 @@
 #include "JsonObjectList.h"
 
+#include "TemplateText.h"
 #include "Xlate.h"
+
+#include <QSet>
 
 namespace kareport
 {
@@ -10,12 +13,18 @@ void storeJsonObject(const JsonNode &node, const FindVariable &findVariable, UDa
     if (!node.expectObject()) {
         return;
     }
+    QSet<QString> names;
     for (const QString &name : node.keys()) {
         const auto parser = findVariable(name);
         if (!parser) {
             continue;
         }
         const JsonNode member = node[name];
+        if (names.contains(foldedKey(name))) {
+            member.fail(Xlate("the variable \"%1\" stands twice: each variable was expected once").arg(name));
+            return;
+        }
+        names.insert(foldedKey(name));
         const QJsonValue &value = member.value();
         bool fits = false;
         switch (value.type()) {
@@ -24,6 +33,10 @@ void storeJsonObject(const JsonNode &node, const FindVariable &findVariable, UDa
         case QJsonValue::Double: fits = parser->storeNumber(value.toDouble(), object); break;
         case QJsonValue::String: fits = parser->store(value.toString().toStdString(), object); break;
         default: break;
+        }
+        // What was set on the command line is a text where the variable wants one.
+        if (const auto given = member.givenText(); given && !value.isString()) {
+            fits = parser->store(given->toStdString(), object);
         }
         if (!fits) {
             member.fail(Xlate("the value of \"%1\" does not fit: %2 was expected").arg(name, parser->expected()));

@@ -30,17 +30,17 @@ std::optional<OutputKind> outputKindFromName(const QString &name)
     return std::nullopt;
 }
 
-std::optional<OutputKind> outputKindFromFile(const QString &file)
+std::optional<OutputKind> outputKindOf(const QString &file, std::optional<OutputKind> otherwise)
 {
     if (file == u"-") {
-        return OutputKind::Text;
+        return otherwise.value_or(OutputKind::Text);
     }
     for (const KindRow &row : kinds) {
         if (file.endsWith(row.ending, Qt::CaseInsensitive)) {
             return row.kind;
         }
     }
-    return std::nullopt;
+    return otherwise;
 }
 
 QString outputKindNames()

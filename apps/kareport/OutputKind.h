@@ -16,8 +16,9 @@ enum class OutputKind
 
 /// The kind of a name such as "rep".
 std::optional<OutputKind> outputKindFromName(const QString &name);
-/// The kind that a file name's ending says; "-" is text.
-std::optional<OutputKind> outputKindFromFile(const QString &file);
+/// The kind that a file name's ending says, or `otherwise` where it says none. Standard output, "-", says none, and is
+/// text without an `otherwise`.
+std::optional<OutputKind> outputKindOf(const QString &file, std::optional<OutputKind> otherwise = std::nullopt);
 /// The names of all kinds, for messages.
 QString outputKindNames();
 

@@ -55,6 +55,10 @@ ExitStatus writeOutputs(UReportDoc &report, const Job &job, Progress &progress, 
 {
     ExitStatus status = exitDone;
     for (const Output &output : job.outputs) {
+        if (isInterrupted()) {
+            printError(Xlate("kareport: stopped before \"%1\" was written").arg(output.file));
+            return exitInterrupted;
+        }
         if (!output.isStandardOutput()) {
             progress.begin(Xlate("Writing %1").arg(output.file), 0);
         }
@@ -88,7 +92,7 @@ std::optional<QString> RenderCommand::usageError() const
         return Xlate("--as: one of %1 was expected").arg(outputKindNames());
     }
     for (const QString &file : outputs) {
-        if (as.isEmpty() && !outputKindFromFile(file)) {
+        if (!outputKindOf(file, outputKindFromName(as))) {
             return Xlate("the ending of \"%1\" says no kind: --as with one of %2 was expected")
                 .arg(file, outputKindNames());
         }
@@ -107,7 +111,8 @@ ExitStatus RenderCommand::run(int &argc, char **argv) const
     if (const auto wrong = applySets(source, sets)) {
         return usage(*wrong);
     }
-    Job readyJob = readJob(source);
+    const auto kindOtherwise = outputKindFromName(as);
+    Job readyJob = readJob(source, kindOtherwise);
     if (source.error()) {
         printError(source.error()->message());
         return exitInput;
@@ -115,10 +120,10 @@ ExitStatus RenderCommand::run(int &argc, char **argv) const
     if (!outputs.isEmpty()) {
         readyJob.outputs.clear();
         for (const QString &file : outputs) {
-            readyJob.outputs.push_back({file, as.isEmpty() ? *outputKindFromFile(file) : *outputKindFromName(as)});
+            readyJob.outputs.push_back({file, *outputKindOf(file, kindOtherwise)});
         }
     } else if (readyJob.outputs.empty()) {
-        readyJob.outputs.push_back({QStringLiteral("-"), as.isEmpty() ? OutputKind::Text : *outputKindFromName(as)});
+        readyJob.outputs.push_back({QStringLiteral("-"), *outputKindOf(QStringLiteral("-"), kindOtherwise)});
     }
 
     // What Qt has to say about its surroundings (no session, no screen) is nothing to a person who renders a report.

@@ -18,6 +18,7 @@ namespace kareport
 struct RowBatch
 {
     static constexpr std::size_t most = 512;
+    static constexpr std::size_t mostBytes = std::size_t(1) << 20; ///< of the file, and one row more
 
     std::vector<UDataObject> objects = std::vector<UDataObject>(most);
     std::size_t count = 0;           ///< objects in use
@@ -47,7 +48,7 @@ private:
     std::array<RowBatch, 2> batches_;
     std::size_t used_ = 1; ///< the batch that was handed out last
     bool started_ = false;
-    std::counting_semaphore<2> free_{2};
+    std::counting_semaphore<3> free_{2}; // and one that lets the thread go at the end
     std::counting_semaphore<2> ready_{0};
     std::jthread thread_;
 };

@@ -12,8 +12,12 @@ namespace kareport
 Expected<TemplateFile> readTemplateSource(const QString &path)
 {
     const QFileInfo info(path);
-    if (!info.exists() || info.isDir()) {
+    if (!info.exists()) {
         return InputError{path, std::nullopt, Xlate("the template file cannot be read: there is no such file")};
+    }
+    if (!info.isFile()) {
+        return InputError{path, std::nullopt,
+                          Xlate("a template file was expected; this is a folder, a pipe or a device")};
     }
     if (info.size() > largestTemplateFile) {
         return InputError{path, TextPlace(),
@@ -34,14 +38,18 @@ Expected<TemplateFile> readTemplateSource(const QString &path)
 
 InputError whyNotLoaded(const QString &path, const TemplateFile &file, const QString &name)
 {
-    for (const TemplateRemark &remark : checkTemplates(file)) {
-        if (remark.isError) {
-            return {path, remark.place, Xlate("the template \"%1\" cannot be loaded: %2").arg(name, remark.text)};
-        }
+    if (const auto remark = firstUnreadTemplate(file)) {
+        return {path, remark->place,
+                name.isEmpty() ? remark->text
+                               : Xlate("the template \"%1\" cannot be loaded: %2").arg(name, remark->text)};
     }
-    return {path, TextPlace(),
-            Xlate("there is no template named \"%1\": one of %2 was expected")
-                .arg(name, templateNames(file).join(QStringLiteral(", ")))};
+    const QStringList names = templateNames(file);
+    if (names.isEmpty()) {
+        return {path, TextPlace(), Xlate("the file holds no template: a <ReportTemplate> element was expected")};
+    }
+    return {
+        path, TextPlace(),
+        Xlate("there is no template named \"%1\": one of %2 was expected").arg(name, names.join(QStringLiteral(", ")))};
 }
 
 } // namespace kareport

@@ -3,12 +3,11 @@
 #include "VariableType.h"
 #include "Xlate.h"
 
-#include <QUtf8StringView>
+#include <QLocale>
 
 #include <algorithm>
 #include <charconv>
 #include <cmath>
-#include <cstdlib>
 #include <limits>
 #include <string>
 
@@ -35,11 +34,13 @@ bool isDigit(char character)
     return character >= '0' && character <= '9';
 }
 
-/// A number too small for a double is 0 or nearly so; one too large is no number.
+/// A number too small for a double is 0; one too large is no number.
 bool parseOutOfRange(std::string_view text, double &number)
 {
-    number = std::strtod(std::string(text).c_str(), nullptr);
-    return std::isfinite(number);
+    long double wide = 0;
+    const auto result = std::from_chars(text.data(), text.data() + text.size(), wide);
+    number = static_cast<double>(wide);
+    return result.ec == std::errc() && std::isfinite(number);
 }
 
 bool parseWhole(std::string_view text, qint32 &number)
@@ -82,7 +83,10 @@ bool parseStation(std::string_view text, double &number)
 {
     text = trimmed(text);
     const std::size_t plus = text.find('+', 1);
-    const bool grouped = plus != std::string_view::npos && isDigit(text[plus - 1]) && plus + 1 < text.size() &&
+    const std::size_t sign = !text.empty() && (text[0] == '-' || text[0] == '+') ? 1 : 0;
+    const bool grouped = plus != std::string_view::npos && plus > sign && plus + 1 < text.size() &&
+                         std::all_of(text.begin() + static_cast<std::ptrdiff_t>(sign),
+                                     text.begin() + static_cast<std::ptrdiff_t>(plus), isDigit) &&
                          isDigit(text[plus + 1]) && text.find_first_of("eE") == std::string_view::npos;
     if (!grouped) {
         return parseNumber(text, number);
@@ -90,6 +94,16 @@ bool parseStation(std::string_view text, double &number)
     std::string joined(text.substr(0, plus));
     joined += text.substr(plus + 1);
     return parseNumber(joined, number);
+}
+
+/// A number as a text: whole numbers without an exponent, others with the fewest digits that say them.
+QString textOf(double number)
+{
+    constexpr double exactlyWhole = 9007199254740992.0; // 2^53
+    if (number == std::floor(number) && std::fabs(number) <= exactlyWhole) {
+        return QString::number(static_cast<qint64>(number));
+    }
+    return QString::number(number, 'g', QLocale::FloatingPointShortest);
 }
 
 void assignUtf8(QString &target, std::string_view text)
@@ -215,8 +229,8 @@ bool ValueParser::storeNumber(double number, UDictionary &object) const
         object.Refill<qint32>(id_) = fits ? static_cast<qint32>(number) : 0;
         return fits;
     }
-    case Form::Text: object.Refill<QString>(id_) = QString::number(number, 'g', 15); return true;
-    case Form::PointNumber: object.Refill<UPointNumber>(id_).text() = QString::number(number, 'g', 15); return true;
+    case Form::Text: object.Refill<QString>(id_) = textOf(number); return true;
+    case Form::PointNumber: object.Refill<UPointNumber>(id_).text() = textOf(number); return true;
     case Form::Boolean: object.Refill<bool>(id_) = number != 0; return number == 0 || number == 1;
     default: object.Refill<double>(id_) = number * factor_; return true;
     }

@@ -2,6 +2,8 @@
 
 #include <CLI/CLI.hpp>
 
+#include <cstdio>
+#include <new>
 #include <string>
 #include <vector>
 
@@ -64,15 +66,13 @@ CLI::App *addRender(CLI::App &program, RenderOptions &options)
         ->add_option("-o,--output", options.outputs,
                      "Output file instead of the job's; - for standard output. May stand several times")
         ->type_name("FILE")
-        ->expected(1)
-        ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
+        ->allow_extra_args(false);
     render->add_option("--as", options.as, "Kind of the outputs where their names do not say it: rep, text")
         ->type_name("KIND");
     render
         ->add_option("--set", options.sets, "Set a key of the job, as settings.lengthUnit=ft. May stand several times")
         ->type_name("KEY=VALUE")
-        ->expected(1)
-        ->multi_option_policy(CLI::MultiOptionPolicy::TakeAll);
+        ->allow_extra_args(false);
     render->add_flag("--progress", options.progress, "Show how far the work has come");
     render->add_flag("--quiet", options.quiet, "Say nothing but errors");
     render->footer(
@@ -84,9 +84,7 @@ CLI::App *addRender(CLI::App &program, RenderOptions &options)
     return render;
 }
 
-} // namespace
-
-int main(int argc, char **argv)
+int runProgram(int argc, char **argv)
 {
     CLI::App program("Fixed-pitch reports for civil engineering and surveying");
     program.name("kareport");
@@ -135,4 +133,23 @@ int main(int argc, char **argv)
         return kareport::TemplatesCommand{text(templatesFile), text(templatesName), templatesJson}.run();
     }
     return kareport::CheckCommand{text(checkFile)}.run();
+}
+
+} // namespace
+
+int main(int argc, char **argv)
+{
+    int status = 0;
+    try {
+        status = runProgram(argc, argv);
+    } catch (const std::bad_alloc &) {
+        kareport::printError(QStringLiteral("kareport: error: there is not enough memory for this input"));
+        return kareport::exitInput;
+    }
+    // A full disk behind standard output shows when the last of it is written.
+    if (std::fflush(stdout) != 0 || std::ferror(stdout) != 0) {
+        kareport::printError(QStringLiteral("kareport: standard output could not be written"));
+        return status == kareport::exitDone ? kareport::exitOutput : status;
+    }
+    return status;
 }

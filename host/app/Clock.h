@@ -11,7 +11,7 @@ namespace kareport
 
 /// The date and time that reports are dated with: the local time, unless a host or a test has fixed it.
 KAREPORT_EXPORT QDateTime currentTime();
-/// Fixes the time; nothing lets the clock run again.
+/// Fixes the time; `std::nullopt` lets the clock run again.
 KAREPORT_EXPORT void fixTime(const std::optional<QDateTime> &time);
 
 } // namespace kareport

@@ -6,6 +6,9 @@
 namespace
 {
 
+/// The current folder when the program was loaded; a program may change it later.
+const QString startedIn = QDir::currentPath();
+
 struct Folders
 {
     QString library;
@@ -31,7 +34,7 @@ QString GetLibraryDir(bool /*reserved*/)
 
 QString GetStartPathName()
 {
-    return folders().start.isEmpty() ? QDir::currentPath() : folders().start;
+    return folders().start.isEmpty() ? startedIn : folders().start;
 }
 
 QString GetTempDir(bool /*reserved*/)

@@ -24,6 +24,23 @@ CViewPane::CViewPane()
 CViewPane::~CViewPane()
 {
     std::erase(openPanes(), this);
+    views_.clear(); // while the pane is still whole: its views ask for it when they go
+}
+
+bool CViewPane::IsOpen(const CViewPane *pane)
+{
+    return std::find(openPanes().begin(), openPanes().end(), pane) != openPanes().end();
+}
+
+void CViewPane::SetPlace(CViewPane * /*parent*/, unsigned style, const QRect *rect)
+{
+    style_ = style;
+    rect_ = rect != nullptr ? std::optional(*rect) : std::nullopt;
+}
+
+void CViewPane::RemoveView(UView *view)
+{
+    std::erase_if(views_, [view](const auto &held) { return held.get() == view; });
 }
 
 void CViewPane::AddView(std::unique_ptr<UView> view)
@@ -63,8 +80,10 @@ bool CViewPane::CanClosePane()
 
 void CViewPane::ClosePane()
 {
-    // The pane is no longer open while its views go: a document that closes with its last view must not find it.
-    std::erase(openPanes(), this);
+    // The pane is no longer open while its views go: a document that closes with its last view must not close it again.
+    if (std::erase(openPanes(), this) == 0) {
+        return;
+    }
     views_.clear();
     delete this;
 }

@@ -2,10 +2,12 @@
 
 #include "KaReportExport.h"
 
+#include <QRect>
 #include <QString>
 #include <QStringList>
 
 #include <memory>
+#include <optional>
 #include <vector>
 
 class UDocument;
@@ -23,6 +25,12 @@ public:
     /// Takes a view into the pane, which owns it from then on.
     void AddView(std::unique_ptr<UView> view);
     const std::vector<std::unique_ptr<UView>> &GetViews() const { return views_; }
+    /// Takes a view out of the pane and destroys it.
+    void RemoveView(UView *view);
+    /// Where the pane is to stand: window style and rectangle (null for the usual one). Called once, before it is shown.
+    virtual void SetPlace(CViewPane *parent, unsigned style, const QRect *rect);
+    unsigned GetStyle() const { return style_; }
+    const std::optional<QRect> &GetRect() const { return rect_; }
     /// The document of the pane's first view, or null.
     UDocument *GetActiveDocument() const;
 
@@ -47,12 +55,16 @@ public:
     /// Closes the pane without asking: its views go, and the pane itself with them.
     virtual void ClosePane();
 
+    /// Whether a pointer is a pane that is open.
+    static bool IsOpen(const CViewPane *pane);
     /// The captions of all open panes, in the order in which they were opened.
     static void GetPaneCaptions(QStringList &captions);
 
 private:
     std::vector<std::unique_ptr<UView>> views_;
     QString text_;
+    unsigned style_ = 0;
+    std::optional<QRect> rect_;
     int windowNumber_ = 0;
     bool visible_ = false;
 };

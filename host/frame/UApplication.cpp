@@ -20,7 +20,10 @@ UApplication::UApplication()
 
 UApplication::~UApplication()
 {
-    // Documents that close may still ask for the application.
+    // Documents that close may still ask for the application and its templates.
+    for (const auto &docTemplate : templates_) {
+        docTemplate->CloseAllDocuments();
+    }
     templates_.clear();
     currentApplication() = nullptr;
 }

@@ -17,8 +17,20 @@ UDocTemplate::UDocTemplate(unsigned resourceId, DocumentFactory makeDocument, Pa
 
 UDocTemplate::~UDocTemplate()
 {
+    CloseAllDocuments();
+}
+
+void UDocTemplate::CloseAllDocuments()
+{
     while (!documents_.empty()) {
-        delete documents_.back();
+        UDocument *document = documents_.back();
+        document->SetAutoDelete(true);
+        document->OnCloseDocument();
+        // A document that defers its closing goes all the same.
+        if (!documents_.empty() && documents_.back() == document) {
+            document->CloseAllPanes();
+            delete document;
+        }
     }
 }
 
@@ -41,16 +53,20 @@ UDocument *UDocTemplate::OpenReportDocumentFile(const QString &path, int /*addTo
     }
 
     // While it is being filled, the document must not go with a pane that closes.
+    const bool autoDelete = document->IsAutoDelete();
     document->SetAutoDelete(false);
     const bool filled = path.isEmpty() ? document->OnNewDocument() : document->OnOpenDocument(path);
     if (!filled) {
         if (pane != nullptr && ownPane) {
             pane->ClosePane();
         }
+        while (!ownPane && !document->GetViews().empty()) {
+            pane->RemoveView(document->GetViews().front());
+        }
         delete document;
         return nullptr;
     }
-    document->SetAutoDelete(true);
+    document->SetAutoDelete(autoDelete);
     if (!path.isEmpty()) {
         document->SetPathName(path, true);
     }
@@ -60,15 +76,17 @@ UDocument *UDocTemplate::OpenReportDocumentFile(const QString &path, int /*addTo
     return document;
 }
 
-CViewPane *UDocTemplate::CreateNewPane(UDocument *document, CViewPane * /*parent*/, unsigned /*style*/,
-                                       const QRect * /*rect*/)
+CViewPane *UDocTemplate::CreateNewPane(UDocument *document, CViewPane *parent, unsigned style, const QRect *rect)
 {
     if (!makePane_ || !makeView_) {
         return nullptr;
     }
     CViewPane *pane = makePane_();
     if (pane != nullptr) {
+        pane->SetPlace(parent, style, rect);
         ShowIn(pane, document);
+        // Not through the document's own SetTitle, which a report takes for a new title.
+        pane->SetWindowTextW(static_cast<const UDocument *>(document)->GetTitle());
     }
     return pane;
 }

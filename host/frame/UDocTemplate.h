@@ -24,7 +24,7 @@ public:
     /// @param resourceId   identifies the texts, menus and icons of the kind
     /// @param makePane, makeView  may be empty in a program without windows: documents are then made without a view
     /// @param creatorName  the name by which the template is found
-    /// @param savesInFrame, reserved  1 and 1 for reports: the kind's windows are part of the saved window layout
+    /// @param savesInFrame, reserved  for the host's frame, which a program without windows does not have
     UDocTemplate(unsigned resourceId, DocumentFactory makeDocument, PaneFactory makePane, ViewFactory makeView,
                  QString creatorName, int savesInFrame, int reserved);
     ~UDocTemplate();
@@ -45,6 +45,8 @@ public:
                                       unsigned style, const QRect *rect);
     /// Makes a pane with a view of a document; null in a program without windows.
     CViewPane *CreateNewPane(UDocument *document, CViewPane *parent, unsigned style, const QRect *rect);
+    /// Closes the template's documents and their panes without asking.
+    void CloseAllDocuments();
     /// Lets the views of a pane show their document for the first time, and shows the pane if wanted.
     void InitialUpdatePane(CViewPane *pane, UDocument *document, int makeVisible);
 

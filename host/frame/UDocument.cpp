@@ -2,6 +2,7 @@
 
 #include "AppMessageBox.h"
 #include "CViewPane.h"
+#include "ReplaceFile.h"
 #include "UApplication.h"
 #include "UArchive.h"
 #include "UDocTemplate.h"
@@ -10,7 +11,6 @@
 
 #include <QFile>
 #include <QFileInfo>
-#include <QSaveFile>
 
 #include <algorithm>
 
@@ -76,15 +76,17 @@ void UDocument::UpdateAllViews(UView *sender, long hint, void *hintObject)
 
 void UDocument::UpdateFrameCounts()
 {
+    const auto visiblePane = [](const UView *view) { return view->IsVisible() ? view->GetParentPane() : nullptr; };
     for (const UView *view : views_) {
-        if (view->IsVisible()) {
-            view->GetParentPane()->SetWindowNumber(-1);
+        if (CViewPane *pane = visiblePane(view)) {
+            pane->SetWindowNumber(-1);
         }
     }
     std::vector<CViewPane *> panes;
     for (const UView *view : views_) {
-        if (view->IsVisible() && view->GetParentPane()->GetWindowNumber() == -1) {
-            panes.push_back(view->GetParentPane());
+        CViewPane *pane = visiblePane(view);
+        if (pane != nullptr && pane->GetWindowNumber() == -1) {
+            panes.push_back(pane);
             panes.back()->SetWindowNumber(static_cast<int>(panes.size()));
         }
     }
@@ -126,18 +128,16 @@ bool UDocument::OnOpenDocument(const QString &path)
 
 bool UDocument::OnSaveDocument(const QString &path)
 {
-    QSaveFile file(path);
-    if (!file.open(QIODevice::WriteOnly)) {
-        return false;
+    const bool saved = kareport::replaceFile(path, [&](QIODevice &device) {
+        UArchive archive(device, UArchive::Mode::Storing, QFileInfo(path).absoluteFilePath());
+        Serialize(archive);
+        return archive.IsGood();
+    });
+    if (saved) {
+        SetModifiedFlag(false);
+        OnDocumentEvent(DocumentEvent::AfterSaveDocument);
     }
-    UArchive archive(file, UArchive::Mode::Storing, QFileInfo(path).absoluteFilePath());
-    Serialize(archive);
-    if (!archive.IsGood() || !file.commit()) {
-        return false;
-    }
-    SetModifiedFlag(false);
-    OnDocumentEvent(DocumentEvent::AfterSaveDocument);
-    return true;
+    return saved;
 }
 
 void UDocument::Serialize(UArchive & /*archive*/) {}
@@ -185,10 +185,13 @@ void UDocument::CloseAllPanes()
     const bool autoDelete = autoDelete_;
     autoDelete_ = false;
     while (!views_.empty()) {
-        if (CViewPane *pane = views_.front()->GetParentPane()) {
+        UView *view = views_.front();
+        if (CViewPane *pane = view->GetParentPane()) {
             pane->ClosePane();
-        } else {
-            RemoveView(views_.front());
+        }
+        // A view without a pane, or of a pane that only closes later, goes by itself.
+        if (!views_.empty() && views_.front() == view) {
+            RemoveView(view);
         }
     }
     autoDelete_ = autoDelete;
@@ -200,9 +203,12 @@ void UDocument::OnCloseDocument()
     OnDocumentEvent(DocumentEvent::AfterCloseDocument);
     DeleteContents();
     if (autoDelete_) {
+        OnAutoDelete();
         delete this;
     }
 }
+
+void UDocument::OnAutoDelete() {}
 
 void UDocument::DeleteContents() {}
 

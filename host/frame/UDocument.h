@@ -51,9 +51,10 @@ public:
     /// Numbers the panes that show the document.
     virtual void UpdateFrameCounts();
 
-    /// Makes the document an empty, unmodified one without a file. @return false when that is not possible
+    /// Makes the document an unmodified one without a file, emptied by `DeleteContents`. @return false when that is not possible
     virtual bool OnNewDocument();
-    /// Loads a file through `Serialize`. @return false when it cannot be read; the document is then empty
+    /// Loads a file through `Serialize`. @return false when it cannot be opened, with the document as it was, or not be
+    /// read, with the document empty
     virtual bool OnOpenDocument(const QString &path);
     /// Stores into a file through `Serialize`, in one step: a failed write leaves an earlier file as it was.
     virtual bool OnSaveDocument(const QString &path);
@@ -70,6 +71,8 @@ public:
     /// Closes the panes and the document.
     virtual void OnCloseDocument();
     virtual void DeleteContents();
+    /// Called when a closed document is about to delete itself.
+    virtual void OnAutoDelete();
     virtual void OnDocumentEvent(DocumentEvent event);
     /// Whether the document only serves a search of the shell's; no document of this host does.
     virtual bool IsSearchAndOrganizeHandler() const { return false; }

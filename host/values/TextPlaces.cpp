@@ -10,19 +10,22 @@ TextPlaces::TextPlaces(QStringView text) : text_(text), lineStarts_{0}
     for (qsizetype at = text.indexOf(u'\n'); at >= 0; at = text.indexOf(u'\n', at + 1)) {
         lineStarts_.push_back(at + 1);
     }
-    hasSurrogates_ = std::any_of(text.begin(), text.end(), [](QChar unit) { return unit.isLowSurrogate(); });
+    for (qsizetype at = 1; at < text.size(); ++at) {
+        if (text[at].isLowSurrogate() && text[at - 1].isHighSurrogate()) {
+            pairs_.push_back(at);
+        }
+    }
 }
 
 TextPlace TextPlaces::of(qsizetype position) const
 {
     position = std::clamp<qsizetype>(position, 0, text_.size());
-    const auto next = std::upper_bound(lineStarts_.begin(), lineStarts_.end(), position);
-    const QStringView before = text_.sliced(*(next - 1), position - *(next - 1));
-    qsizetype pairs = 0;
-    if (hasSurrogates_) {
-        pairs = std::count_if(before.begin(), before.end(), [](QChar unit) { return unit.isLowSurrogate(); });
-    }
-    return {next - lineStarts_.begin(), before.size() - pairs + 1};
+    const auto nextLine = std::upper_bound(lineStarts_.begin(), lineStarts_.end(), position);
+    const qsizetype lineStart = *(nextLine - 1);
+    // Inside a pair is the place of the pair: its second half is counted with the pairs before.
+    const auto firstPair = std::lower_bound(pairs_.begin(), pairs_.end(), lineStart);
+    const auto pairs = std::upper_bound(firstPair, pairs_.end(), position) - firstPair;
+    return {nextLine - lineStarts_.begin(), position - lineStart - pairs + 1};
 }
 
 } // namespace kareport

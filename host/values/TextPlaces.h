@@ -28,7 +28,7 @@ public:
 private:
     QStringView text_;
     std::vector<qsizetype> lineStarts_;
-    bool hasSurrogates_;
+    std::vector<qsizetype> pairs_; ///< where the second halves of surrogate pairs stand
 };
 
 } // namespace kareport

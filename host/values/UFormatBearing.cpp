@@ -41,7 +41,11 @@ void UFormatBearing::ConvertToDisplayString(double value, QString &text) const
     }
     const bool gon = unit_ == unitGon;
     const double circle = gon ? 400.0 : 360.0;
-    double angle = std::fmod(value * (gon ? 200.0 / std::numbers::pi : 180.0 / std::numbers::pi), circle);
+    value *= gon ? 200.0 / std::numbers::pi : 180.0 / std::numbers::pi;
+    if (!std::isfinite(value)) {
+        return;
+    }
+    double angle = std::fmod(value, circle);
     if (angle < 0) {
         angle += circle;
     }

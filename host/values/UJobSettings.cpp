@@ -53,11 +53,11 @@ void UJobSettings::appendUnit(TextBuffer &out) const
 void UJobSettings::appendUnitLength(TextBuffer &out, double value, bool fromInternal, bool withUnit, int decimals,
                                     int width, bool blankZero) const
 {
-    if (!std::isfinite(value)) {
-        return;
-    }
     if (fromInternal) {
         value /= kareport::metresIn(lengthUnit);
+    }
+    if (!std::isfinite(value)) {
+        return;
     }
     const FixedNotation fixed(value, decimals == -1 ? lengthDecimals : decimals);
     if (blankZero && fixed.isZero()) {
@@ -93,11 +93,11 @@ void UJobSettings::appendStation(TextBuffer &out, double value, bool fromInterna
                                  int decimals, int width, bool /*withZone*/, bool /*withEquation*/, bool blankZero,
                                  bool alignRight, bool trimZeros, bool showSign) const
 {
-    if (!std::isfinite(value)) {
-        return;
-    }
     if (fromInternal) {
         value /= kareport::metresIn(lengthUnit);
+    }
+    if (!std::isfinite(value)) {
+        return;
     }
     const FixedNotation fixed(value, decimals == -1 ? stationDecimals : decimals);
     const std::size_t start = out.size();

@@ -1,0 +1,205 @@
+#include "CsvFile.h"
+
+#include <gtest/gtest.h>
+
+#include <random>
+
+namespace
+{
+
+using namespace csv;
+
+/// A file of rows whose number is their index.
+QByteArray numberedRows(int count)
+{
+    QByteArray content = "Number,Northing,Note,Count\r\n";
+    for (int i = 0; i < count; ++i) {
+        const QByteArray n = QByteArray::number(i);
+        // Every third row has empty cells, so that a refilled object would show what it held before.
+        content += i % 3 == 0 ? n + ",,,\r\n" : n + ',' + n + ".5,note " + n + ',' + n + "\r\n";
+    }
+    return content;
+}
+
+QString numberedRow(std::size_t index)
+{
+    const QString n = QString::number(index);
+    return index % 3 == 0 ? n + QStringLiteral("|-|-|-") : QStringLiteral("%1|%1.5|note %1|%1").arg(n);
+}
+
+TEST(CsvObjectList, MakesObjectsOfRows)
+{
+    const CsvFile file("Number,Northing,Note,Count\n12A,-2.5,\"a, b\",3\n,,,\n1,INF,x,-1\n");
+    EXPECT_EQ(textOf(file.list->GetAt(0)), QStringLiteral("12A|-2.5|a, b|3"));
+    EXPECT_EQ(textOf(file.list->GetAt(1)), QStringLiteral("-|-|-|-")) << "empty cells store no entry";
+    EXPECT_EQ(textOf(file.list->GetAt(2)), QStringLiteral("1|inf|x|-1"));
+    EXPECT_EQ(file.list->GetAt(3), nullptr);
+    EXPECT_EQ(file.list->GetAt(1000), nullptr);
+    EXPECT_FALSE(file.list->error());
+}
+
+TEST(CsvObjectList, PassesColumnsOverThatTheDictionaryDoesNotKnow)
+{
+    const CsvFile file("Code,Number,,Northing\nany,1,thing,2\n\"\",2,\"a\nb\",3\n");
+    EXPECT_EQ(textOf(file.list->GetAt(0)), QStringLiteral("1|2|-|-"));
+    EXPECT_EQ(textOf(file.list->GetAt(1)), QStringLiteral("2|3|-|-"));
+    EXPECT_FALSE(file.list->error());
+}
+
+TEST(CsvObjectList, OfAHeaderAloneIsEmpty)
+{
+    for (const char *content : {"Number", "Number\n", "\xEF\xBB\xBFNumber,Note\r\n\r\n\r\n"}) {
+        const CsvFile file(content);
+        EXPECT_EQ(file.list->GetAt(0), nullptr) << content;
+        EXPECT_FALSE(file.list->error()) << content;
+        file.list->Sort({numberId});
+        EXPECT_EQ(file.list->GetAt(0), nullptr) << content;
+        EXPECT_FALSE(file.list->error()) << content;
+    }
+}
+
+TEST(CsvObjectList, ReadsALongFileInTurn)
+{
+    constexpr std::size_t count = 5000;
+    const CsvFile file(numberedRows(count));
+    for (std::size_t i = 0; i < count; ++i) {
+        ASSERT_EQ(textOf(file.list->GetAt(i)), numberedRow(i));
+        ASSERT_EQ(textOf(file.list->GetAt(i)), numberedRow(i)) << "asked for twice";
+    }
+    EXPECT_EQ(file.list->GetAt(count), nullptr);
+    EXPECT_FALSE(file.list->error());
+}
+
+TEST(CsvObjectList, GoesBackAndForth)
+{
+    constexpr std::size_t count = 3000;
+    const CsvFile file(numberedRows(count));
+    for (const std::size_t index :
+         {std::size_t(2999), std::size_t(0), std::size_t(511), std::size_t(512), std::size_t(511), std::size_t(1600),
+          std::size_t(1599), std::size_t(3000), std::size_t(2999), std::size_t(0)})
+    {
+        EXPECT_EQ(textOf(file.list->GetAt(index)), index < count ? numberedRow(index) : QStringLiteral("null"));
+    }
+    std::mt19937 random(20240305);
+    for (int i = 0; i < 20; ++i) {
+        const std::size_t index = random() % count;
+        EXPECT_EQ(textOf(file.list->GetAt(index)), numberedRow(index));
+    }
+}
+
+TEST(CsvObjectList, ReadsWhileItIsAskedFor)
+{
+    const QByteArray content = numberedRows(100000);
+    std::size_t read = 0;
+    const CsvFile file(content, [&read](std::size_t bytes) {
+        read = bytes;
+        return true;
+    });
+    EXPECT_NE(file.list->GetAt(0), nullptr);
+    EXPECT_GT(read, 0U);
+    EXPECT_LT(read, static_cast<std::size_t>(content.size()) / 10) << "the first row needs only the beginning";
+    EXPECT_NE(file.list->GetAt(50000), nullptr);
+    EXPECT_GT(read, static_cast<std::size_t>(content.size()) / 3);
+    EXPECT_LT(read, static_cast<std::size_t>(content.size()) * 2 / 3);
+    EXPECT_EQ(file.list->GetAt(100000), nullptr);
+    EXPECT_EQ(read, static_cast<std::size_t>(content.size()));
+}
+
+TEST(CsvObjectList, EndsWhereItIsStopped)
+{
+    int calls = 0;
+    const CsvFile file(numberedRows(100000), [&calls](std::size_t) { return ++calls < 3; });
+    std::size_t index = 0;
+    while (file.list->GetAt(index) != nullptr) {
+        ++index;
+    }
+    EXPECT_LT(index, 100000U);
+    EXPECT_EQ(calls, 3);
+    EXPECT_FALSE(file.list->error()) << "to be stopped is no mistake of the file";
+    EXPECT_EQ(file.list->GetAt(0), nullptr);
+    EXPECT_EQ(calls, 3) << "it stays stopped";
+}
+
+TEST(CsvObjectList, EveryMistakeHasItsPlace)
+{
+    struct Row
+    {
+        const char *content;
+        const char *place;
+        const char *contains;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {"", "1:1", "header row", "an empty file"},
+        {"\n\n", "1:1", "header row", "blank lines only"},
+        {"Number,\"Note\n1,2\n", "1:8", "no closing quote", "a header row that does not end"},
+        {"Number,Note,Number\n", "1:13", "\"Number\"", "a column twice"},
+        {"Number,Note,NUMBER\n1,2,3\n", "1:13", "\"NUMBER\"", "a column twice but for case"},
+        {"Code;Northing\n1;2\n", "1:1", "no column", "nothing that the dictionary knows: most often another delimiter"},
+        {"Number,Note\n1,a\n1,a,b\n", "3:5", "3 cells", "a cell too many"},
+        {"Number,Note\n1,a\n1,\n1,a,\n", "4:5", "2 were expected", "an empty cell too many"},
+        {"Number,Northing\n1,2\n2,x\n", "3:3", "\"x\"", "a cell that does not fit is quoted"},
+        {"Number,Northing\n1,2\n2,1e999\n", "3:3", "\"1e999\"", "a number out of range"},
+        {"Count,Northing\n1,2\n\"1.5\",2\n", "3:1", "\"1.5\"", "a quoted cell: its quote is the place"},
+        {"Note,Count\n\"a\nb\",x\n", "3:4", "\"Count\"",
+         "the column is named; the cell stands in the row's second line"},
+        {"Note,Count\n\xC3\xA4\xF0\x9D\x84\x9E,x\n", "2:4", "a whole number", "columns count characters"},
+        {"Number,Count\n1,2\n\n3,4\n", "3:1", "1 cells", "a blank line inside"},
+    };
+    for (const Row &row : rows) {
+        const CsvFile file(row.content);
+        for (std::size_t i = 0; file.list->GetAt(i) != nullptr; ++i) {
+        }
+        ASSERT_TRUE(file.list->error()) << row.reason;
+        EXPECT_EQ(placeText(file.list->error()), QString::fromUtf8(row.place)) << row.reason;
+        EXPECT_TRUE(textOfError(file.list->error()).contains(QString::fromUtf8(row.contains)))
+            << row.reason << ": " << textOfError(file.list->error()).toStdString();
+        EXPECT_EQ(file.list->error()->file, file.path()) << row.reason;
+    }
+}
+
+TEST(CsvObjectList, ARowWithFewerCellsNamesItsLine)
+{
+    const CsvFile file("Number,Northing,Note\n1,2,a\n1,2\n");
+    EXPECT_NE(file.list->GetAt(0), nullptr);
+    EXPECT_EQ(file.list->GetAt(1), nullptr);
+    ASSERT_TRUE(file.list->error() && file.list->error()->place);
+    EXPECT_EQ(file.list->error()->place->line, 3);
+    EXPECT_TRUE(textOfError(file.list->error()).contains(u"2 cells"));
+    EXPECT_TRUE(textOfError(file.list->error()).contains(u"3 were expected"));
+}
+
+TEST(CsvObjectList, RowsBeforeAMistakeInTheMiddleAreRead)
+{
+    QByteArray content = numberedRows(1400);
+    content.replace("\r\n700,700.5,", "\r\n700,7oo.5,");
+    const CsvFile file(content);
+    for (int round = 0; round < 2; ++round) {
+        for (std::size_t i = 0; i < 700; ++i) {
+            ASSERT_EQ(textOf(file.list->GetAt(i)), numberedRow(i)) << "round " << round;
+        }
+        EXPECT_EQ(file.list->GetAt(700), nullptr) << "round " << round;
+        EXPECT_EQ(placeText(file.list->error()), QStringLiteral("702:5")) << "round " << round;
+        EXPECT_EQ(file.list->GetAt(701), nullptr) << "round " << round;
+    }
+}
+
+TEST(CsvObjectList, ALongCellIsQuotedInPart)
+{
+    const CsvFile file("Count\n" + QByteArray(100000, 'x') + "\n");
+    EXPECT_EQ(file.list->GetAt(0), nullptr);
+    EXPECT_TRUE(textOfError(file.list->error()).contains(QString(40, u'x')));
+    EXPECT_LT(textOfError(file.list->error()).size(), 300);
+}
+
+TEST(CsvObjectList, SortingIsStoppedToo)
+{
+    int calls = 0;
+    const CsvFile file(numberedRows(100000), [&calls](std::size_t) { return ++calls < 3; });
+    file.list->Sort({numberId});
+    EXPECT_EQ(calls, 3);
+    EXPECT_EQ(file.list->GetAt(0), nullptr);
+    EXPECT_FALSE(file.list->error());
+}
+
+} // namespace

@@ -1,0 +1,173 @@
+#include "JsonObjectList.h"
+
+#include "JobFolder.h"
+#include "VariableType.h"
+
+#include <gtest/gtest.h>
+
+#include <numbers>
+
+namespace
+{
+
+using kareport::DataUnits;
+using kareport::errorOf;
+using kareport::JsonNode;
+using kareport::JsonSource;
+using kareport::ValueParser;
+
+constexpr unsigned id = 3;
+
+/// Reads the root of a JSON text as one object; its members of the name "V" are of a type.
+class StoredObject
+{
+public:
+    StoredObject(const QByteArray &json, int type, const DataUnits &units = {})
+    {
+        auto read = JsonSource::fromBytes(QStringLiteral("job.json"), json);
+        EXPECT_EQ(errorOf(read), nullptr) << json.constData();
+        auto &source = std::get<JsonSource>(read);
+        const auto findVariable = [&](const QString &name) -> std::optional<ValueParser> {
+            return name == u"V" ? std::optional(ValueParser(type, id, units)) : std::nullopt;
+        };
+        kareport::storeJsonObject(JsonNode(source), findVariable, object);
+        error = source.error();
+    }
+
+    /// The value with its kind; "none" when there is none.
+    QString text() const
+    {
+        const UDictEntry *entry = object.Find(id);
+        if (entry == nullptr) {
+            return QStringLiteral("none");
+        }
+        const QString kind = QString::number(entry->GetKind()) + u' ';
+        switch (entry->GetKind()) {
+        case 1: return kind + QString::number(*static_cast<const bool *>(entry->GetData()) ? 1 : 0);
+        case 4: return kind + QString::number(*static_cast<const qint32 *>(entry->GetData()));
+        case 8: return kind + QString::number(*static_cast<const double *>(entry->GetData()), 'g', 15);
+        case 16: return kind + *static_cast<const QString *>(entry->GetData());
+        case 32: return kind + static_cast<const UPointNumber *>(entry->GetData())->Convert();
+        default: return QStringLiteral("?");
+        }
+    }
+
+    UDataObject object;
+    std::optional<kareport::InputError> error;
+};
+
+TEST(JsonObjectList, StoresMembersByTheTypeOfTheVariable)
+{
+    struct Row
+    {
+        int type;
+        const char *json;
+        const char *expected;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {VARIABLE_INTEGER, R"({"V": 12})", "4 12", "a whole number"},
+        {VARIABLE_INTEGER, R"({"V": 12.0})", "4 12", "12.0 is whole"},
+        {VARIABLE_INTEGER, R"({"V": -2147483648})", "4 -2147483648", "the smallest"},
+        {VARIABLE_INTEGER, R"({"V": 2147483647})", "4 2147483647", "the largest"},
+        {VARIABLE_INTEGER, R"({"V": "12"})", "4 12", "a text of a number"},
+        {VARIABLE_DOUBLE, R"({"V": 1250.5})", "8 1250.5", "a number"},
+        {VARIABLE_DOUBLE, R"({"V": "INF"})", "8 inf", "infinite has to be a text in JSON"},
+        {VARIABLE_DOUBLE, R"({"V": "NAN"})", "8 nan", "not-a-number has to be a text in JSON"},
+        {VARIABLE_COORDINATE, R"({"V": -2.5})", "8 -2.5", "metres"},
+        {VARIABLE_STATION, R"({"V": "12+345.678"})", "8 12345.678", "a text with its plus"},
+        {VARIABLE_STATION, R"({"V": 12345.678})", "8 12345.678", "a number"},
+        {VARIABLE_TEXT, R"({"V": "Harbour Board"})", "16 Harbour Board", "a text"},
+        {VARIABLE_TEXT, R"({"V": "\u00e4\ud834\udd1e"})", "16 \xC3\xA4\xF0\x9D\x84\x9E", "escapes"},
+        {VARIABLE_TEXT, R"({"V": 12})", "16 12", "a number as a text"},
+        {VARIABLE_NAME, R"({"V": 0.1})", "16 0.1", "a number as a text"},
+        {VARIABLE_NUMBER, R"({"V": "BM-3"})", "32 BM-3", "a point's number"},
+        {VARIABLE_NUMBER, R"({"V": 12})", "32 12", "a point's number without quotes"},
+        {VARIABLE_NUMBER, R"({"V": 100000})", "32 100000", "no exponent"},
+        {VARIABLE_BOOLEAN, R"({"V": true})", "1 1", "true"},
+        {VARIABLE_BOOLEAN, R"({"V": false})", "1 0", "false"},
+        {VARIABLE_BOOLEAN, R"({"V": "Yes"})", "1 1", "a word"},
+        {VARIABLE_FLAG, R"({"V": 1})", "1 1", "1"},
+        {VARIABLE_FLAG, R"({"V": 0})", "1 0", "0"},
+        {VARIABLE_FLAG, R"({"V": "*"})", "1 1", "a star"},
+        {VARIABLE_DOUBLE, R"({"V": null})", "none", "null is no value"},
+        {VARIABLE_TEXT, R"({"V": ""})", "none", "an empty text is no value"},
+        {VARIABLE_DOUBLE, R"({"V": ""})", "none", "an empty text is no value"},
+        {VARIABLE_DOUBLE, R"({})", "none", "no member"},
+        {VARIABLE_DOUBLE, R"({"W": [1, {}], "X": {"V": 1}, "Y": true})", "none", "what the dictionary does not know"},
+        {VARIABLE_DOUBLE, R"({"V": 1, "V": 2})", "8 2", "of members of one name the last counts"},
+    };
+    for (const Row &row : rows) {
+        const StoredObject stored(row.json, row.type);
+        EXPECT_FALSE(stored.error) << row.reason << ": " << textOfError(stored.error).toStdString();
+        EXPECT_EQ(stored.text(), QString::fromUtf8(row.expected)) << row.reason;
+    }
+}
+
+TEST(JsonObjectList, NumbersAreMultipliedIntoInternalUnits)
+{
+    DataUnits units;
+    units.length = kareport::LengthUnit::UsSurveyFoot;
+    units.area = kareport::AreaUnit::Hectare;
+    units.angle = kareport::AngleUnit::Radian;
+    EXPECT_EQ(StoredObject(R"({"V": 3937})", VARIABLE_LENGTH, units).text(), QStringLiteral("8 1200"));
+    EXPECT_EQ(StoredObject(R"({"V": "3937"})", VARIABLE_LENGTH, units).text(), QStringLiteral("8 1200"));
+    EXPECT_EQ(StoredObject(R"({"V": 1.5})", VARIABLE_AREA, units).text(), QStringLiteral("8 15000"));
+    EXPECT_EQ(StoredObject(R"({"V": 0.5})", VARIABLE_BEARING, units).text(), QStringLiteral("8 0.5"));
+    EXPECT_EQ(StoredObject(R"({"V": 180})", VARIABLE_BEARING).text(),
+              QStringLiteral("8 ") + QString::number(std::numbers::pi, 'g', 15));
+    units.angle = kareport::AngleUnit::Degree;
+    units.sexagesimal = true;
+    EXPECT_EQ(StoredObject(R"({"V": "180-00-00"})", VARIABLE_ANGLE, units).text(),
+              QStringLiteral("8 ") + QString::number(std::numbers::pi, 'g', 15));
+}
+
+TEST(JsonObjectList, AValueThatDoesNotFitIsAnErrorWithItsPlace)
+{
+    struct Row
+    {
+        int type;
+        const char *json;
+        const char *contains;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {VARIABLE_INTEGER, R"({"V": @1.5})", "a whole number", "not whole"},
+        {VARIABLE_INTEGER, R"({"V": @3000000000})", "a whole number", "beyond 32 bits"},
+        {VARIABLE_INTEGER, R"({"V": @-3000000000})", "a whole number", "beyond 32 bits below 0"},
+        {VARIABLE_INTEGER, R"({"V": @"twelve"})", "a whole number", "a word"},
+        {VARIABLE_INTEGER, R"({"V": @true})", "a whole number", "a boolean"},
+        {VARIABLE_DOUBLE, R"({"V": @"1,5"})", "a number", "a decimal comma"},
+        {VARIABLE_DOUBLE, R"({"V": @[1]})", "a number", "a list"},
+        {VARIABLE_DOUBLE, R"({"V": @{}})", "a number", "an object"},
+        {VARIABLE_DOUBLE, R"({"V": @false})", "a number", "a boolean"},
+        {VARIABLE_TEXT, R"({"V": @["a"]})", "a text", "a list"},
+        {VARIABLE_STATION, R"({"V": @"1+2+3"})", "12+345.678", "no station"},
+        {VARIABLE_BOOLEAN, R"({"V": @2})", "yes or no", "neither 0 nor 1"},
+        {VARIABLE_FLAG, R"({"V": @"x"})", "yes or no", "a letter"},
+        {VARIABLE_DOUBLE, "{\"W\": 1,\n  \"V\": @\"x\"}", "\"V\"", "the variable is named"},
+    };
+    for (const Row &row : rows) {
+        const MarkedText marked(row.json);
+        const StoredObject stored(marked.text, row.type);
+        EXPECT_EQ(placeText(stored.error), marked.place) << row.reason;
+        EXPECT_TRUE(textOfError(stored.error).contains(QString::fromUtf8(row.contains)))
+            << row.reason << ": " << textOfError(stored.error).toStdString();
+    }
+}
+
+TEST(JsonObjectList, AnElementThatIsNoObjectIsAnError)
+{
+    auto read = JsonSource::fromBytes(QStringLiteral("job.json"), "{\"values\": [{},\n 5]}");
+    auto &source = std::get<JsonSource>(read);
+    UDataObject object;
+    const auto nothing = [](const QString &) -> std::optional<ValueParser> { return std::nullopt; };
+    const JsonNode values = JsonNode(source)[QStringLiteral("values")];
+    kareport::storeJsonObject(values[0], nothing, object);
+    EXPECT_FALSE(source.failed());
+    kareport::storeJsonObject(values[1], nothing, object);
+    EXPECT_EQ(placeText(source.error()), QStringLiteral("2:2"));
+    EXPECT_EQ(textOfError(source.error()), QStringLiteral("an object was expected"));
+}
+
+} // namespace
