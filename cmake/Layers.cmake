@@ -9,9 +9,6 @@ target_compile_options(ka_options INTERFACE
     -Woverloaded-virtual -Wundef -Wcast-align)
 # The libraries' own functions call each other directly, also where they are offered outside.
 target_compile_options(ka_options INTERFACE -fno-semantic-interposition)
-if(KAREPORT_LTO)
-    set(CMAKE_INTERPROCEDURAL_OPTIMIZATION ON)
-endif()
 if(KAREPORT_WERROR)
     target_compile_options(ka_options INTERFACE -Werror)
 endif()

@@ -4,7 +4,9 @@
 #include <QIODevice>
 
 #include <algorithm>
+#include <array>
 #include <cstdint>
+#include <cstring>
 #include <vector>
 
 namespace kareport
@@ -13,16 +15,24 @@ namespace kareport
 namespace
 {
 
-/// Characters looked at together. A fixed count lets the compiler use vector instructions.
+/// Characters looked at together.
 constexpr std::size_t runLength = 16;
 
-/// Whether a run holds only characters that are written as one byte of the same value, and none that is `special`.
+/// Whether a run holds only characters that are written as one byte of the same value, and none that is `special`. Eight
+/// bytes are looked at in one machine word.
 template <typename Character>
 bool isPlainRun(const Character *run, Character special)
 {
-    Character found = 0;
-    for (std::size_t i = 0; i < runLength; ++i) {
-        found = static_cast<Character>(found | (run[i] > 0x7F) | (run[i] == special));
+    constexpr std::uint64_t ones = sizeof(Character) == 1 ? 0x0101010101010101 : 0x0001000100010001;
+    constexpr std::uint64_t tops = ones << (8 * sizeof(Character) - 1);
+    constexpr std::uint64_t notAscii = sizeof(Character) == 1 ? tops : 0xFF80FF80FF80FF80;
+    std::array<std::uint64_t, runLength * sizeof(Character) / sizeof(std::uint64_t)> words;
+    std::memcpy(words.data(), run, sizeof words);
+    std::uint64_t found = 0;
+    for (const std::uint64_t word : words) {
+        // A character equal to `special` becomes 0, and taking 1 from it sets the top bit that it did not have.
+        const std::uint64_t difference = word ^ (ones * special);
+        found |= (word & notAscii) | ((difference - ones) & ~difference & tops);
     }
     return found == 0;
 }

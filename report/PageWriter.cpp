@@ -30,6 +30,9 @@ void PageWriter::clear()
 
 bool PageWriter::write(QStringView text, int style)
 {
+    if (text_.owns(text)) {
+        return write(text.toString(), style);
+    }
     if (!text_.append(text)) {
         return false;
     }

@@ -62,14 +62,18 @@ bool ReportText::widen() const
     return true;
 }
 
+bool ReportText::owns(QStringView text) const
+{
+    const char16_t *begin = text.utf16();
+    return !isNarrow_ && std::less_equal<>()(wide_.data(), begin) && std::less<>()(begin, wide_.data() + wide_.size());
+}
+
 bool ReportText::append(QStringView text)
 {
     if (size() + text.size() > longest) {
         return false;
     }
-    // A piece of this very text would move with it.
-    const auto *begin = text.utf16();
-    if (!isNarrow_ && std::less_equal<>()(wide_.data(), begin) && std::less<>()(begin, wide_.data() + wide_.size())) {
+    if (owns(text)) {
         return append(text.toString());
     }
     if (isNarrow_ && !isLatin1(text) && !widen()) {

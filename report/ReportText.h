@@ -39,6 +39,9 @@ public:
     bool isNarrow() const { return isNarrow_; }
     QLatin1StringView narrowView() const;
 
+    /// Whether a text is a piece of this very text, which a change may move.
+    bool owns(QStringView text) const;
+
     /// Makes room for so many characters and the 0 behind them. @return false when there is no memory for them or they
     /// are more than `longest`; the text stays as it is
     bool reserve(qint64 characters) { return isNarrow_ ? narrow_.reserve(characters) : wide_.reserve(characters); }

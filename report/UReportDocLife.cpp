@@ -9,6 +9,8 @@
 
 #include "ReportEntry.h"
 
+#include <algorithm>
+
 namespace
 {
 
@@ -20,14 +22,21 @@ bool showsReport(const UView *view)
     return dynamic_cast<const kareport::ReportViewPort *>(view) != nullptr;
 }
 
+/// A caption without the number that a pane has among several of one document.
+QStringView withoutNumber(QStringView caption)
+{
+    qsizetype end = caption.size();
+    while (end > 0 && caption[end - 1].isDigit()) {
+        --end;
+    }
+    return end > 0 && end < caption.size() && caption[end - 1] == u':' ? caption.first(end - 1) : caption;
+}
+
 bool isTaken(const QString &title, const QStringList &captions)
 {
-    for (const QString &caption : captions) {
-        if (kareport::equalFolded(title, caption)) {
-            return true;
-        }
-    }
-    return false;
+    return std::any_of(captions.begin(), captions.end(), [&title](const QString &caption) {
+        return kareport::equalFolded(title, caption) || kareport::equalFolded(title, withoutNumber(caption));
+    });
 }
 
 } // namespace

@@ -14,9 +14,12 @@ public:
         calls = 0;
         lastBytes = 0;
     }
-    /// Room for so many characters and the 0 behind them.
+    /// Room for so many characters of one byte and the 0 behind them.
     static LimitedMemory ofCharacters(std::size_t characters) { return LimitedMemory(bytesFor(characters)); }
-    static std::size_t bytesFor(std::size_t characters) { return (characters + 1) * sizeof(char16_t); }
+    static std::size_t bytesFor(std::size_t characters) { return characters + 1; }
+    /// Room for so many characters of UTF-16 and the 0 behind them.
+    static LimitedMemory ofWideCharacters(std::size_t characters) { return LimitedMemory(wideBytesFor(characters)); }
+    static std::size_t wideBytesFor(std::size_t characters) { return (characters + 1) * sizeof(char16_t); }
 
     static void *reallocate(void *memory, std::size_t bytes)
     {

@@ -1,5 +1,4 @@
 #include "ReportTextCodec.h"
-#include "ReplaceFile.h"
 
 #include "PrintQt.h"
 

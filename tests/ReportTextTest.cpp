@@ -6,6 +6,7 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <limits>
 #include <new>
 
 namespace
@@ -13,7 +14,7 @@ namespace
 
 using kareport::ReportText;
 
-/// A text in which no two neighbours are alike, without zeros.
+/// A text in which no two neighbours are alike, without zeros. Beyond 255 characters it is kept in UTF-16.
 QString pattern(qsizetype size)
 {
     QString text(size, u' ');
@@ -39,9 +40,12 @@ TEST(ReportText, BeginsAsOneZeroedBlock)
     const LimitedMemory memory;
     const ReportText text(LimitedMemory::reallocate);
     EXPECT_EQ(text.size(), 0);
+    EXPECT_TRUE(text.isNarrow());
+    EXPECT_EQ(memory.lastBytes, LimitedMemory::bytesFor(32000)) << "one byte a character at first";
     EXPECT_TRUE(text.view().isEmpty());
     EXPECT_TRUE(isZeroFrom(text, 0, 32000));
-    EXPECT_EQ(memory.lastBytes, 32001 * sizeof(char16_t));
+    EXPECT_FALSE(text.isNarrow()) << "it was asked for in UTF-16";
+    EXPECT_EQ(memory.lastBytes, LimitedMemory::wideBytesFor(32000));
 }
 
 TEST(ReportText, GrowingPastABlockKeepsEveryCharacterWrittenBefore)
@@ -115,7 +119,7 @@ TEST(ReportText, WithoutMemoryAppendingAnswersFalseAndChangesNothing)
         {31999, 2, false, "half of the text would fit, none of it is written"},
     };
     for (const Row &row : rows) {
-        const LimitedMemory memory = LimitedMemory::ofCharacters(32000);
+        const LimitedMemory memory = LimitedMemory::ofWideCharacters(32000);
         ReportText text(LimitedMemory::reallocate);
         const QString start = pattern(row.size);
         ASSERT_TRUE(text.append(start));
@@ -124,7 +128,7 @@ TEST(ReportText, WithoutMemoryAppendingAnswersFalseAndChangesNothing)
         EXPECT_TRUE(text.view() == (row.expected ? start + more : start)) << row.reason;
         EXPECT_EQ(text.data()[text.size()], u'\0') << row.reason;
 
-        memory.largest = LimitedMemory::bytesFor(1000000);
+        memory.largest = LimitedMemory::wideBytesFor(1000000);
         const QString before = text.view().toString();
         EXPECT_TRUE(text.append(more)) << row.reason << ": usable again when there is memory";
         EXPECT_TRUE(text.view() == before + more) << row.reason;
@@ -146,19 +150,19 @@ TEST(ReportText, WithoutMemoryALineEndAnswersFalseAndChangesNothing)
         {32000, false, "the block is full"},
     };
     for (const Row &row : rows) {
-        const LimitedMemory memory = LimitedMemory::ofCharacters(32000);
+        const LimitedMemory memory = LimitedMemory::ofWideCharacters(32000);
         ReportText text(LimitedMemory::reallocate);
         const QString start = pattern(row.size);
         ASSERT_TRUE(text.append(start));
         EXPECT_EQ(text.appendLineEnd(), row.expected) << row.reason;
         EXPECT_TRUE(text.view() == (row.expected ? start + QStringLiteral("\r\n") : start)) << row.reason;
-        EXPECT_EQ(memory.largest, LimitedMemory::bytesFor(32000));
+        EXPECT_EQ(memory.largest, LimitedMemory::wideBytesFor(32000));
     }
 }
 
 TEST(ReportText, AssigningReplacesTheTextAndLeavesItEmptyWithoutMemory)
 {
-    const LimitedMemory memory = LimitedMemory::ofCharacters(32000);
+    const LimitedMemory memory = LimitedMemory::ofWideCharacters(32000);
     ReportText text(LimitedMemory::reallocate);
     const QString longer = pattern(500);
     const QString shorter = QStringLiteral("abc");
@@ -173,30 +177,35 @@ TEST(ReportText, AssigningReplacesTheTextAndLeavesItEmptyWithoutMemory)
     EXPECT_TRUE(text.view() == longer);
     EXPECT_TRUE(text.assign(QString()));
     EXPECT_EQ(text.size(), 0);
-    EXPECT_EQ(memory.lastBytes, LimitedMemory::bytesFor(64000)) << "the block that was asked for in vain";
+    EXPECT_EQ(memory.lastBytes, LimitedMemory::wideBytesFor(64000)) << "the block that was asked for in vain";
 }
 
 TEST(ReportText, MoreCharactersThanFitIntoALengthAreRefusedWithoutAllocating)
 {
-    const LimitedMemory memory = LimitedMemory::ofCharacters(64000);
-    ReportText text(LimitedMemory::reallocate);
-    ASSERT_TRUE(text.append(u"x"));
-    constexpr qint64 longest = 2147483647;
-    const int calls = memory.calls;
-    EXPECT_FALSE(text.reserve(longest + 1));
-    EXPECT_FALSE(text.reserve(std::numeric_limits<qint64>::max()));
-    // Never read: only its length counts.
-    EXPECT_FALSE(text.append(QStringView(text.data(), longest))) << "2^31 characters together";
-    EXPECT_EQ(memory.calls, calls) << "nothing was allocated";
-    EXPECT_FALSE(text.reserve(longest)) << "no memory for so many here";
-    EXPECT_GT(memory.calls, calls) << "the longest text of all is asked for";
-    EXPECT_TRUE(text.view() == u"x");
+    for (const bool narrow : {true, false}) {
+        const LimitedMemory memory = LimitedMemory::ofWideCharacters(64000);
+        ReportText text(LimitedMemory::reallocate);
+        ASSERT_TRUE(text.append(narrow ? u"x" : u"\u6E2C"));
+        ASSERT_EQ(text.isNarrow(), narrow);
+        constexpr qint64 longest = 2147483647;
+        const int calls = memory.calls;
+        EXPECT_FALSE(text.reserve(longest + 1)) << narrow;
+        EXPECT_FALSE(text.reserve(std::numeric_limits<qint64>::max())) << narrow;
+        // Never read: only its length counts.
+        EXPECT_FALSE(text.append(QStringView(u"x", longest))) << narrow << ": 2^31 characters together";
+        EXPECT_EQ(memory.calls, calls) << narrow << ": nothing was allocated";
+        EXPECT_FALSE(text.reserve(longest)) << narrow << ": no memory for so many here";
+        EXPECT_GT(memory.calls, calls) << narrow << ": the longest text of all is asked for";
+        EXPECT_EQ(text.isNarrow(), narrow);
+        EXPECT_TRUE(text.view() == (narrow ? u"x" : u"\u6E2C"));
+    }
 }
 
 TEST(ReportText, NoRoomIsNeededForNothingOrLess)
 {
     const LimitedMemory memory;
     ReportText text(LimitedMemory::reallocate);
+    ASSERT_NE(text.data(), nullptr); // in UTF-16 from now on
     const int calls = memory.calls;
     for (const qint64 characters : {qint64(0), qint64(-1), qint64(32000)}) {
         EXPECT_TRUE(text.reserve(characters)) << characters;
@@ -215,14 +224,14 @@ TEST(ReportText, WithoutMemoryForTheFirstBlockThereIsNoText)
 
 TEST(ReportText, WithLittleMemoryLeftItGrowsByWhatIsNeeded)
 {
-    const LimitedMemory memory = LimitedMemory::ofCharacters(96000);
+    const LimitedMemory memory = LimitedMemory::ofWideCharacters(96000);
     ReportText text(LimitedMemory::reallocate);
     const QString whole = pattern(96000);
     ASSERT_TRUE(text.append(QStringView(whole).first(64000)));
     EXPECT_TRUE(text.append(QStringView(whole).sliced(64000))) << "twice the memory is not to be had, three blocks are";
     EXPECT_TRUE(text.view() == whole);
     EXPECT_FALSE(text.append(u"x"));
-    EXPECT_EQ(memory.largest, LimitedMemory::bytesFor(96000));
+    EXPECT_EQ(memory.largest, LimitedMemory::wideBytesFor(96000));
 }
 
 TEST(ReportText, MemoryGrowsGeometrically)
@@ -244,8 +253,9 @@ TEST(ReportText, ClearingGoesBackToOneZeroedBlock)
     ASSERT_TRUE(text.append(pattern(70000)));
     text.clear();
     EXPECT_EQ(text.size(), 0);
-    EXPECT_TRUE(isZeroFrom(text, 0, 32000));
+    EXPECT_TRUE(text.isNarrow()) << "one byte a character again";
     EXPECT_EQ(memory.lastBytes, LimitedMemory::bytesFor(32000));
+    EXPECT_TRUE(isZeroFrom(text, 0, 32000));
 
     ASSERT_TRUE(text.append(pattern(32000)));
     text.clear();
@@ -260,6 +270,7 @@ TEST(ReportText, ClearingWorksWithoutAnyMemory)
     memory.largest = 0;
     text.clear();
     EXPECT_EQ(text.size(), 0);
+    EXPECT_FALSE(text.isNarrow()) << "there is no other block to be had";
     EXPECT_TRUE(isZeroFrom(text, 0, 32000));
     EXPECT_TRUE(text.append(pattern(32000)));
     EXPECT_TRUE(text.view() == pattern(32000));

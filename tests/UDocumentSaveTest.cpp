@@ -87,7 +87,7 @@ TEST(UDocumentSave, LoadsFromAFile)
     EXPECT_EQ(log.events, QStringList{QStringLiteral("open")});
 }
 
-TEST(UDocumentSave, IsEmptyWhenAFileCannotBeRead)
+TEST(UDocumentSave, StaysAsItIsWhenAFileCannotBeOpenedAndIsEmptyWhenItCannotBeRead)
 {
     const QTemporaryDir folder;
     const QString broken = folder.filePath(QStringLiteral("broken.txt"));
@@ -95,21 +95,22 @@ TEST(UDocumentSave, IsEmptyWhenAFileCannotBeRead)
     struct Row
     {
         QString path;
+        const char *expected;
         const char *reason;
     };
     const Row rows[] = {
-        {broken, "reading fails in the middle"},
-        {folder.filePath(QStringLiteral("missing.txt")), "no such file"},
-        {folder.filePath(QStringLiteral("missing/a.txt")), "no such folder"},
-        {folder.path(), "a folder"},
-        {QString(), "no name"},
+        {broken, "", "reading fails in the middle: what was read goes, and what was there has gone"},
+        {folder.filePath(QStringLiteral("missing.txt")), "earlier", "no such file"},
+        {folder.filePath(QStringLiteral("missing/a.txt")), "earlier", "no such folder"},
+        {folder.path(), "earlier", "a folder"},
+        {QString(), "earlier", "no name"},
     };
     for (const Row &row : rows) {
         FrameLog log;
         TextDocument document(log);
         document.content = "earlier";
         EXPECT_FALSE(document.OnOpenDocument(row.path)) << row.reason;
-        EXPECT_EQ(document.content.toStdString(), "") << row.reason;
+        EXPECT_EQ(document.content.toStdString(), row.expected) << row.reason;
         EXPECT_EQ(log.events, QStringList()) << row.reason;
     }
 }

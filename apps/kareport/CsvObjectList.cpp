@@ -51,8 +51,9 @@ void CsvObjectList::readHeader(const FindVariable &findVariable)
         anyKnown |= known;
         const auto earlier = names.constFind(foldedKey(name));
         if (earlier != names.constEnd() && (known || *earlier)) {
-            error_ = reader_.errorAt(reader_.placeOfCell(i),
-                                     Xlate("the column \"%1\" stands twice: each variable was expected once").arg(name));
+            error_ =
+                reader_.errorAt(reader_.placeOfCell(i),
+                                Xlate("the column \"%1\" stands twice: each variable was expected once").arg(name));
             return;
         }
         names.insert(foldedKey(name), known);
