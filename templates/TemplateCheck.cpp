@@ -192,9 +192,9 @@ void Checker::checkVariables(const DictionaryElement &dictionary)
         }
         const qint32 id = leadingInteger(variable.id.value.view());
         if (variable.id.value.text() != QString::number(id)) {
-            warning(
-                variable.id.exists() ? variable.id.source : variable.element.source,
-                Xlate("the identifier %1 counts as %2: a whole number was expected").arg(quoted(variable.id)).arg(id));
+            warning(variable.id.exists() ? variable.id.source : variable.element.source,
+                    Xlate("the identifier %1 counts as %2: a whole number was expected")
+                        .arg(quoted(variable.id), QString::number(id)));
         }
         const QString key = foldedKey(variable.variableName.value.view());
         if (known.contains(key)) {
@@ -202,12 +202,12 @@ void Checker::checkVariables(const DictionaryElement &dictionary)
                     Xlate("the variable %1 stands twice in the dictionary: the last one counts")
                         .arg(quoted(variable.variableName)));
         } else if (ids.contains(id)) {
-            warning(variable.element.source, Xlate("the variables \"%1\" and %2 share the identifier %3")
-                                                 .arg(ids.value(id), quoted(variable.variableName))
-                                                 .arg(id));
+            warning(variable.element.source,
+                    Xlate("the variables %1 and %2 share the identifier %3")
+                        .arg(ids.value(id), quoted(variable.variableName), QString::number(id)));
         }
         known.insert(key);
-        ids.insert(id, variable.variableName.value.text());
+        ids.insert(id, quoted(variable.variableName));
     }
 }
 
@@ -246,13 +246,13 @@ void Checker::checkField(const FieldElement &field, const QSet<QString> *variabl
     const FieldFormat format = parseFieldFormat(field.format.value.view());
     const qsizetype formatSource = field.format.exists() ? field.format.source : field.element.source;
     if (format.width > widestColumn || format.width < -widestColumn || format.decimals > widestColumn) {
-        error(formatSource, Xlate("the format %1 is beyond %2 characters").arg(quoted(field.format)).arg(widestColumn));
+        error(formatSource,
+              Xlate("the format %1 is beyond %2 characters").arg(quoted(field.format), QString::number(widestColumn)));
     }
     const qsizetype labelSize = field.label.value.size();
     if (isTable && field.format.exists() && labelSize > std::max(format.width, 0)) {
         warning(field.label.source, Xlate("the label %1 is wider than its column of %2: the column takes its width")
-                                        .arg(quoted(field.label))
-                                        .arg(format.width));
+                                        .arg(quoted(field.label), QString::number(format.width)));
     }
     const QStringView align = field.align.value.view();
     if (!align.isEmpty() && !equalFolded(align, u"LEFT") && !equalFolded(align, u"RIGHT") &&

@@ -191,7 +191,7 @@ TEST(HostileTemplate, ChecksManyFieldsWithARemarkOnEach)
 
 TEST(HostileTemplate, ChecksManyRemarksInOneLongLine)
 {
-    constexpr int count = many / 20;
+    constexpr int count = many;
     QByteArray bytes = templateOf(tableOfShortFields(count) + dictionaryOf(1));
     bytes.replace("\n", "");
     bytes.replace("<Title>Title", "<Title>\xF0\x9F\x98\x80"); // places are counted in characters
@@ -201,6 +201,47 @@ TEST(HostileTemplate, ChecksManyRemarksInOneLongLine)
     const qsizetype last = text.lastIndexOf(QStringLiteral("12345"));
     EXPECT_EQ(remarks.back().place.line, 1);
     EXPECT_EQ(remarks.back().place.column, last - 1 + 1) << "the surrogate pair before it is one character";
+}
+
+TEST(HostileTemplate, ReadsAndChecksManyUsesOfADictionaryWithALongName)
+{
+    // Folding the name for every field or key, or naming it in every remark, would take gigabytes.
+    constexpr int fieldCount = 10000;
+    const QByteArray longName(200000, 'd');
+    QByteArray fields;
+    QByteArray keys;
+    for (int i = 0; i < fieldCount; ++i) {
+        fields += numbered("<Field><VariableName>V", i, "</VariableName><Format>5</Format></Field>\n");
+        keys += numbered("<VariableName>V", i, "</VariableName>\n");
+    }
+    const QByteArray list = "<OutputList>" + fields + "</OutputList>";
+    const QByteArray use = "<Name>X</Name><Use>" + longName.toUpper() + "</Use>";
+    QByteArray dictionary = dictionaryOf(1);
+    dictionary.replace("<DictionaryName>D<", "<DictionaryName>" + longName + "<");
+    const QByteArray bytes =
+        templateOf("<Tables><Table>" + use + "<Sort>" + keys + "</Sort>" + list + "</Table></Tables>" + dictionary +
+                   "<Blocks><Block>" + use + list + "</Block></Blocks>");
+
+    const LoadedTemplate loaded(bytes);
+    ASSERT_TRUE(loaded.loaded);
+    const sXmlReportFields &columns = loaded.tpl.GetTable(QStringLiteral("X"))->Fields;
+    const sXmlReportFields &lines = loaded.tpl.GetBlock(QStringLiteral("X"))->Fields;
+    const auto &entries = loaded.tpl.GetSortList(QStringLiteral("X"))->Entries;
+    ASSERT_EQ(columns.size(), std::size_t(fieldCount));
+    ASSERT_EQ(lines.size(), std::size_t(fieldCount));
+    ASSERT_EQ(entries.size(), std::size_t(fieldCount));
+    EXPECT_EQ(columns.front().ID, 1);
+    EXPECT_EQ(columns.back().ID, 0) << "the dictionary has the first variable only";
+    EXPECT_EQ(lines.back().ID, 1) << "a block's lines take over the one before";
+    EXPECT_EQ(entries.back().ID, 1U) << "so do sort keys";
+
+    const auto remarks = kareport::checkTemplates(kareport::TemplateFile(bytes));
+    EXPECT_EQ(remarks.size(), std::size_t(3 * (fieldCount - 1))) << "each but the first variable, three times";
+    qsizetype characters = 0;
+    for (const auto &remark : remarks) {
+        characters += remark.text.size();
+    }
+    EXPECT_LT(characters, 30000 * 200) << "long names are cut short";
 }
 
 TEST(HostileTemplate, ChecksManyTagsThatAreNone)

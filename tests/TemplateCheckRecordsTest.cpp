@@ -153,4 +153,23 @@ TEST(TemplateCheckRecords, RemarksOnFields)
     });
 }
 
+TEST(TemplateCheckRecords, APercentSignOfAValueIsQuotedAsItStands)
+{
+    const char *const inTable = "<Label>Point</Label><Format>8</Format>";
+    expectAll({
+        {inTable,
+         "¦<Label>%1 grade</Label><Format>2</Format>",
+         {{"warning", "the label \"%1 grade\" is wider than its column of 2: the column takes its width"}},
+         "in a label"},
+        {inTable,
+         "<Label>Point</Label>¦<Format>99999%2</Format>",
+         {{"error", "the format \"99999%2\" is beyond 32767 characters"}},
+         "in a format"},
+        {"<Variable><ID>1</ID>",
+         "<Variable>¦<ID>%1</ID>",
+         {{"warning", "the identifier \"%1\" counts as 0: a whole number was expected"}},
+         "in an identifier"},
+    });
+}
+
 } // namespace

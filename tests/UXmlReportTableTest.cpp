@@ -128,6 +128,43 @@ TEST(UXmlReportTable, AnEmptyHeadingLeavesTheOldOne)
     }
 }
 
+TEST(UXmlReportTable, AFailedLoadLeavesTheOldHeadingAndSoDoesReordering)
+{
+    const LoadedTemplate loaded(
+        templateOf(tableOf("X", "D", field("A", "a", "3")) + tableOf("Lost", "Missing", field("B", "b", "4"))));
+    UXmlReportTable table;
+    table.SetColumnSeparator('|');
+    for (const char *name : {"Unknown", "Lost", ""}) {
+        ASSERT_TRUE(table.LoadTable(QStringLiteral("X"), &loaded.tpl));
+        EXPECT_FALSE(table.LoadTable(QString::fromLatin1(name), &loaded.tpl)) << name;
+        EXPECT_FALSE(table.IsLoaded()) << name;
+        EXPECT_EQ(table.GetHeading(), QStringLiteral("a  ")) << name;
+        table.ReorderingHeading();
+        EXPECT_EQ(table.GetHeading(), QStringLiteral("a  ")) << name;
+    }
+    EXPECT_FALSE(table.LoadTable(QStringLiteral("X"), nullptr));
+    table.ReorderingHeading();
+    EXPECT_EQ(table.GetHeading(), QStringLiteral("a  ")) << "no template";
+}
+
+TEST(UXmlReportTable, ReorderingANewHandleGivesNoHeading)
+{
+    UXmlReportTable table;
+    EXPECT_EQ(table.GetHeading(), QString());
+    table.ReorderingHeading();
+    EXPECT_EQ(table.GetHeading(), QString());
+}
+
+TEST(UXmlReportTable, AFillersLabelIsFollowedDirectlyByFiveBlanksAndStn)
+{
+    const LoadedTemplate loaded(templateOf(
+        tableOf("X", "D", field("FILLER", "*", "1") + field("A", "Stn", "8", "RIGHT") + field("B", "b", "1"))));
+    UXmlReportTable table;
+    table.SetColumnSeparator('|');
+    ASSERT_TRUE(table.LoadTable(QStringLiteral("X"), &loaded.tpl));
+    EXPECT_EQ(table.GetHeading(), QStringLiteral("*     Stn|b"));
+}
+
 TEST(UXmlReportTable, GivesTheSortKeysIdentifiers)
 {
     const LoadedTemplate loaded(

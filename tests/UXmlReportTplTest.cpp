@@ -255,6 +255,19 @@ TEST_F(UXmlReportTplTest, TakesATextAsItStandsForTheNameItHas)
     EXPECT_EQ(name(tpl), QStringLiteral("T"));
 }
 
+TEST_F(UXmlReportTplTest, ATextWithoutTheNamedTemplateStaysWithTheListOfItsTemplates)
+{
+    UXmlReportTpl tpl;
+    setName(tpl, QStringLiteral("LEVELS"));
+    const QString text = QString::fromUtf8(stakeout + traverse);
+    EXPECT_FALSE(setXml(tpl, text));
+    EXPECT_EQ(xml(tpl), text);
+    EXPECT_EQ(name(tpl), QStringLiteral("LEVELS"));
+    EXPECT_EQ(list(&UXmlReportTpl::GetAllTPLsByName, tpl).join(u' '), QStringLiteral("STAKEOUT TRAVERSE"));
+    EXPECT_EQ(list(&UXmlReportTpl::GetAllTables, tpl), QStringList());
+    EXPECT_EQ(tpl.GetTemplateTitle(), QString()) << "the list does not hold the name";
+}
+
 TEST_F(UXmlReportTplTest, WithoutANameATemplateWithoutOneIsTaken)
 {
     UXmlReportTpl tpl;

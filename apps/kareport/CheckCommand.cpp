@@ -28,10 +28,8 @@ ExitStatus CheckCommand::run() const
     ExitStatus status = exitDone;
     for (const TemplateRemark &remark : checkTemplates(std::get<TemplateFile>(source))) {
         printLine(QStringLiteral("%1:%2:%3: %4: %5")
-                      .arg(file)
-                      .arg(remark.place.line)
-                      .arg(remark.place.column)
-                      .arg(remark.isError ? QStringLiteral("error") : QStringLiteral("warning"), remark.text));
+                      .arg(file, QString::number(remark.place.line), QString::number(remark.place.column),
+                           remark.isError ? QStringLiteral("error") : QStringLiteral("warning"), remark.text));
         if (remark.isError) {
             status = exitInput;
         }

@@ -120,8 +120,7 @@ private:
                 runner_.source_.fail(
                     path_, Xlate("the %1 \"%2\" cannot be written: the format of its field \"%3\" is beyond %4 "
                                  "characters")
-                               .arg(what, name, field.VariableName)
-                               .arg(widestColumn));
+                               .arg(what, name, field.VariableName, QString::number(widestColumn)));
                 return false;
             }
         }

@@ -92,11 +92,11 @@ void printOutputs(const QString &what, const QJsonArray &outputs)
                       .arg(what, output[u"name"].toString(), output[u"dictionary"].toString()));
         for (const auto &field : output[u"fields"].toArray()) {
             printLine(QStringLiteral("    %1 %2 %3.%4 %5  \"%6\"")
-                          .arg(field[u"variable"].toString(), -20)
-                          .arg(field[u"type"].toString(), -10)
-                          .arg(field[u"width"].toInt(), 4)
-                          .arg(field[u"decimals"].toInt())
-                          .arg(field[u"align"].toString(), field[u"label"].toString()));
+                          .arg(field[u"variable"].toString().leftJustified(20),
+                               field[u"type"].toString().leftJustified(10),
+                               QString::number(field[u"width"].toInt()).rightJustified(4),
+                               QString::number(field[u"decimals"].toInt()), field[u"align"].toString(),
+                               field[u"label"].toString()));
         }
         QStringList keys;
         for (const auto &key : output[u"sort"].toArray()) {
@@ -117,9 +117,8 @@ void printTemplate(const QJsonObject &description)
         printLine(QStringLiteral("dictionary %1").arg(dictionary[u"name"].toString()));
         for (const auto &variable : dictionary[u"variables"].toArray()) {
             printLine(QStringLiteral("    %1 %2 %3")
-                          .arg(variable[u"id"].toInt(), 6)
-                          .arg(variable[u"name"].toString(), -20)
-                          .arg(variable[u"type"].toString()));
+                          .arg(QString::number(variable[u"id"].toInt()).rightJustified(6),
+                               variable[u"name"].toString().leftJustified(20), variable[u"type"].toString()));
         }
     }
     printLine(QStringLiteral("separator %1 (character code)").arg(description[u"separator"].toInt()));
