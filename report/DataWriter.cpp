@@ -12,13 +12,12 @@ constexpr int usualHeadingLinesAfter = 2;
 
 const PageHeading noHeading = {QString(), 0, usualHeadingLinesAfter};
 
-template <typename Handle>
-std::vector<FieldFormatter> formattersOf(const Handle &handle)
+std::vector<FieldFormatter> formattersOf(const UXmlReportTable &table)
 {
     std::vector<FieldFormatter> fields;
-    fields.reserve(static_cast<std::size_t>(handle.GetFieldsCount()));
-    for (int i = 0; i < handle.GetFieldsCount(); ++i) {
-        fields.emplace_back(handle.GetField(i));
+    fields.reserve(static_cast<std::size_t>(table.GetFieldsCount()));
+    for (int i = 0; i < table.GetFieldsCount(); ++i) {
+        fields.emplace_back(table.GetField(i));
     }
     return fields;
 }

@@ -5,31 +5,14 @@
 
 #include <QDir>
 
+#include "JobText.h"
+
 #include <gtest/gtest.h>
 
 namespace
 {
 
-using kareport::errorOf;
-using kareport::Job;
-using kareport::JsonSource;
-
-const QString folder = QDir::rootPath() + QStringLiteral("jobs");
-
-JsonSource sourceOf(const QByteArray &json)
-{
-    auto read = JsonSource::fromBytes(folder + QStringLiteral("/job.json"), json);
-    EXPECT_EQ(errorOf(read), nullptr) << json.constData();
-    return std::get<JsonSource>(std::move(read));
-}
-
-Job jobOf(const QByteArray &json)
-{
-    JsonSource source = sourceOf(json);
-    Job job = readJob(source);
-    EXPECT_FALSE(source.failed()) << source.error()->message().toStdString();
-    return job;
-}
+using jobtext::jobOf;
 
 TEST(JobSettingsReader, SettingsHaveTheHostsDefaults)
 {

@@ -10,8 +10,7 @@ namespace kareport
 namespace
 {
 
-template <typename File>
-bool finish(File &file, bool done, QString *error)
+bool finish(const QFileDevice &file, bool done, QString *error)
 {
     if (!done && error != nullptr) {
         *error = file.errorString();
