@@ -74,6 +74,8 @@ public:
     qint64 linesLeft() const { return qint64(linesPerPage_) - lineNumber_; }
     void writeHeading();
     void writeHeader();
+    /// Counts a line that was not written.
+    void countLine() { ++lineCount_; }
     /// Tells the observer that something was changed.
     void noteChange();
 

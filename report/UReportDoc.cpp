@@ -62,6 +62,7 @@ void UReportDoc::SetData(const QString &text)
 void UReportDoc::Clear()
 {
     page_.clear();
+    image_.clear();
     openedFromRtf_ = false;
 }
 
@@ -111,9 +112,10 @@ void UReportDoc::WriteHeader()
     page_.writeHeader();
 }
 
-void UReportDoc::textWritten(QStringView text, int /*style*/)
+void UReportDoc::textWritten(QStringView text, int style)
 {
     SetModifiedFlag(true);
+    image_.write(text, style, imageForm());
     if (reportWindow_ != nullptr) {
         reportWindow_->WriteLine(text.toString());
     }
@@ -122,6 +124,7 @@ void UReportDoc::textWritten(QStringView text, int /*style*/)
 void UReportDoc::lineEnded()
 {
     SetModifiedFlag(true);
+    image_.write({}, 0, imageForm());
 }
 
 void UReportDoc::changed()
@@ -171,10 +174,4 @@ void UReportDoc::LoadSettings()
 void UReportDoc::SaveSettings()
 {
     WriteProfileString(QString(), marginsEntry, kareport::marginsToText(margins_));
-}
-
-void UReportDoc::SetTextObject(void *object, unsigned size)
-{
-    textObject_ = object;
-    textObjectSize_ = size;
 }

@@ -4,6 +4,7 @@
 #include "PageMeasurement.h"
 #include "PageWriter.h"
 #include "ReportTextCodec.h"
+#include "RichTextImage.h"
 #include "UDataObjectList.h"
 #include "UDocument.h"
 #include "UJobSettings.h"
@@ -26,6 +27,7 @@ namespace kareport
 {
 class ReportWindow;
 struct FormatOptions;
+struct PdfNotes;
 } // namespace kareport
 
 /// A report: fixed-pitch text laid out in pages and lines, written by host code or through a template.
@@ -56,6 +58,9 @@ public:
     bool IsEmpty() const { return page_.text().isEmpty(); }
     /// Writes the text to an open device, in UTF-8. @return false as soon as a write fails
     bool WriteText(QIODevice &device, kareport::LineEnds lineEnds) const;
+    /// Writes the text to an open device as a PDF. @param notes  receives what is missing or went wrong; may be null
+    /// @return false when there is no measured page or no font, or a write fails
+    bool WritePdf(QIODevice &device, kareport::PdfNotes *notes = nullptr) const;
     /// Replaces the text as it is. Counters stay, so what is written next continues the old pages.
     void SetData(const QString &text);
     /// Empties the report. The next line written begins page 1.
@@ -84,6 +89,25 @@ public:
     void WriteHeader();
     void SetHeaderFlag(bool on) { page_.setHeaderFlag(on); }
     bool GetHeaderFlag() const { return page_.headerFlag(); }
+
+    // --- Rich text --------------------------------------------------------------------------------------------------
+
+    /// Switches rich-text mode: while it is on, what is written goes into a rich-text image as well.
+    void SetRTFDataFlag(bool on) { image_.setOn(on); }
+    bool GetRTFDataFlag() const { return image_.isOn(); }
+    /// Cuts a rich-text document down to its paragraph. @return false, with the text as it was, when it has none
+    static bool ResetFormatString(QString &document) { return kareport::RichTextImage::cutToParagraph(document); }
+    /// Adds a piece of text in a style to the image, or a line end for an empty text; nothing while rich-text mode is off.
+    void WriteRTFData(const QString &text, int style);
+    /// The whole rich-text document; in external-Excel mode only the texts that were written.
+    void GetRTFData(QString &document) const;
+    /// The font table of the document.
+    void GetFontTableData(QString &table) const;
+    /// Writes the font table to an open device. @return false when the write fails
+    bool WriteFontTable(QIODevice &device) const;
+    /// Writes the rich-text document for a word processor to an open device, one byte a character.
+    /// @return false as soon as a write fails
+    bool WriteRichTextFile(QIODevice &device) const;
 
     // --- Page -------------------------------------------------------------------------------------------------------
 
@@ -180,13 +204,15 @@ public:
     /// Always false.
     bool IsThatDocId(const QString &) const { return false; }
 
+    /// The name that temporary files are named after.
     void SetReportFileName(const QString &name) { reportFileName_ = name; }
     const QString &GetReportFileName() const { return reportFileName_; }
     /// Links a report window, which the document destroys with itself; null takes the link away.
     void SetReportWindow(kareport::ReportWindow *window) { reportWindow_ = window; }
     kareport::ReportWindow *GetReportWindow() const { return reportWindow_; }
-    void SetTextObject(void *object, unsigned size);
-    bool HasTextObj() const { return textObjectSize_ != 0; }
+    /// Links the host document that takes the edited text, and the number of its object there.
+    void SetTextObject(void *object, unsigned id);
+    bool HasTextObj() const { return textObjectId_ != 0; }
     void *GetTextObject() const { return textObject_; }
 
     void SetExternalEditorFlag(bool on) { externalEditor_ = on; }
@@ -196,10 +222,32 @@ public:
     void SetExternalExcel() { exportOptions_ |= externalExcel; }
     bool IsExternalExcel() const { return (exportOptions_ & externalExcel) != 0; }
 
+    // --- Files ------------------------------------------------------------------------------------------------------
+
+    /// Saves under a path; asks for one when it is empty or is to become the document's own.
+    /// @return false when the dialog is cancelled, with nothing changed, or the save fails
+    bool DoSave(const QString &path, bool replace) override;
+    /// Writes the file in one step. The name's ending says what: ".rtf" the rich text of the report's view, ".pdf" a PDF,
+    /// any other the report text. An empty report text is saved by doing nothing.
+    /// @return false when it could not be written: an earlier file is then as it was
+    bool OnSaveDocument(const QString &path) override;
+    /// Saves through `OnSaveDocument`. @return 0 for an empty path, else 1 whether the save succeeded or not: callers go on
+    /// either way
+    int SaveFile(const QString &path);
+    bool OnOpenDocument(const QString &path) override;
+    void Serialize(UArchive &archive) override;
+    /// Reads a report file, or a rich-text file, at the end of what the report holds.
+    /// @param keepLineEnds  whether the lines keep their own line ends before the one that each of them gets
+    /// @return 0 for an empty path or a file that cannot be opened, else 1
+    int LoadFile(const QString &path, bool keepLineEnds);
+    /// A temporary name for the report that no report has had.
+    QString GetCurrentReportFileName() const;
+    /// Gives the text that the user edited in the view back to the object that the report was made from.
+    void SaveText();
+
     // --- Life -------------------------------------------------------------------------------------------------------
 
     bool OnNewDocument() override;
-    bool OnSaveDocument(const QString &path) override;
     bool CanCloseFrame(CViewPane *pane) override;
     void OnCloseDocument() override;
     void OnAutoDelete() override;
@@ -226,6 +274,9 @@ private:
     void changed() override;
 
     kareport::FormatOptions formatOptions() const;
+    kareport::RichTextImage::Form imageForm() const;
+    bool saveText(const QString &path);
+    std::optional<bool> saveViewAsRichText(const QString &path);
 
     /// Every live report, with the value true.
     static QHash<const UReportDoc *, bool> UReportMgr;
@@ -256,8 +307,10 @@ private:
     int closeMode_ = 0;
     bool closeDocument_;
     bool openedFromRtf_ = false;
+    bool isSerializing_ = false;
+    kareport::RichTextImage image_;
     void *textObject_ = nullptr;
-    unsigned textObjectSize_ = 0;
+    unsigned textObjectId_ = 0;
     bool closeOptionEnabled_ = true;
     unsigned exportOptions_ = 0;
     QString chainageLabel_;

@@ -1,15 +1,137 @@
 #include "UReportDoc.h"
 
+#include "EditedText.h"
+#include "FileExtension.h"
+#include "Folders.h"
+#include "PdfExport.h"
 #include "ReplaceFile.h"
+#include "ReportViewPort.h"
+#include "SaveDialog.h"
+#include "StandardText.h"
+#include "TemporaryNames.h"
+#include "UApplication.h"
+#include "UView.h"
+#include "WaitCursor.h"
+#include "Xlate.h"
 
-bool UReportDoc::WriteText(QIODevice &device, kareport::LineEnds lineEnds) const
+#include <QBuffer>
+
+#include <algorithm>
+
+namespace
 {
-    const kareport::ReportText &text = page_.text();
-    return text.isNarrow() ? kareport::writeReportText(device, text.narrowView(), lineEnds)
-                           : kareport::writeReportText(device, text.view(), lineEnds);
+
+const QString lastFolderEntry = QStringLiteral("LastOpenDirectoryReport");
+
+bool isRichTextName(const QString &name)
+{
+    return kareport::endsWithExtension(name, u".rtf");
+}
+
+bool isPdfName(const QString &name)
+{
+    return kareport::endsWithExtension(name, u".pdf");
+}
+
+/// The views that show a report's text, in their order.
+std::vector<UView *> reportViews(const UReportDoc &report)
+{
+    std::vector<UView *> views;
+    for (UView *view : report.GetViews()) {
+        if (dynamic_cast<kareport::ReportViewPort *>(view) != nullptr) {
+            views.push_back(view);
+        }
+    }
+    return views;
+}
+
+/// The open document behind a pointer that may be stale; null when it is not open.
+UDocument *openDocument(const void *pointer)
+{
+    if (UApplication::Get() == nullptr) {
+        return nullptr;
+    }
+    for (const auto &docTemplate : UApplication::Get()->GetDocTemplates()) {
+        for (UDocument *document : docTemplate->GetDocuments()) {
+            if (document == pointer) {
+                return document;
+            }
+        }
+    }
+    return nullptr;
+}
+
+} // namespace
+
+bool UReportDoc::DoSave(const QString &path, bool replace)
+{
+    QString name = path;
+    if (path.isEmpty() || replace) {
+        kareport::SaveRequest request;
+        request.defaultExtension = QStringLiteral("rep");
+        request.initialFolder = GetInitialOpenDir(lastFolderEntry);
+        request.flags = kareport::SaveRequest::hideReadOnly | kareport::SaveRequest::overwritePrompt |
+                        kareport::SaveRequest::pathMustExist;
+        request.filter =
+            (openedFromRtf_ ? Xlate("RTF Files (*.rtf)|*.rtf|Report Files (*.rep)|*.rep|PDF (*.pdf)|*.pdf|")
+                            : Xlate("Report Files (*.rep)|*.rep|RTF Files (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|")) +
+            kareport::standardText(kareport::allFilesTitle) + QStringLiteral("|*.*||");
+        const auto chosen = kareport::askSaveName(request);
+        if (!chosen) {
+            return false;
+        }
+        name = *chosen;
+        SetLastOpenDir(name, lastFolderEntry);
+    }
+    const kareport::WaitCursor cursor;
+    if (!OnSaveDocument(name)) {
+        return false;
+    }
+    if (replace) {
+        SetPathName(name, !isRichTextName(name) && !isPdfName(name));
+    }
+    SetModifiedFlag(false);
+    return true;
 }
 
 bool UReportDoc::OnSaveDocument(const QString &path)
+{
+    if (isRichTextName(path)) {
+        // Without a view that can write it, the report text is saved under the name.
+        const auto saved = saveViewAsRichText(path);
+        return saved ? *saved : saveText(path);
+    }
+    if (isPdfName(path)) {
+        return kareport::replaceFile(path, [this](QIODevice &device) { return WritePdf(device); });
+    }
+    return saveText(path);
+}
+
+std::optional<bool> UReportDoc::saveViewAsRichText(const QString &path)
+{
+    for (UView *view : reportViews(*this)) {
+        // The view must hold the report as it is now, and no editor is to be started for it.
+        const bool externalEditor = externalEditor_;
+        externalEditor_ = false;
+        UpdateAllViews(nullptr, 0, nullptr);
+        externalEditor_ = externalEditor;
+        if (std::find(GetViews().begin(), GetViews().end(), view) == GetViews().end()) {
+            continue;
+        }
+        bool isOpen = false;
+        const auto *port = dynamic_cast<const kareport::ReportViewPort *>(view);
+        const bool saved = kareport::replaceFile(path, [&](QIODevice &device) {
+            isOpen = true;
+            return port->streamRichText(device);
+        });
+        if (isOpen) {
+            return saved;
+        }
+    }
+    return std::nullopt;
+}
+
+bool UReportDoc::saveText(const QString &path)
 {
     // An empty report is saved by doing nothing: no file is made and none is emptied.
     if (!IsEmpty() && !kareport::replaceFile(path, [this](QIODevice &device) {
@@ -20,4 +142,70 @@ bool UReportDoc::OnSaveDocument(const QString &path)
     }
     SetModifiedFlag(false);
     return true;
+}
+
+bool UReportDoc::WriteText(QIODevice &device, kareport::LineEnds lineEnds) const
+{
+    const kareport::ReportText &text = page_.text();
+    return text.isNarrow() ? kareport::writeReportText(device, text.narrowView(), lineEnds)
+                           : kareport::writeReportText(device, text.view(), lineEnds);
+}
+
+bool UReportDoc::WritePdf(QIODevice &device, kareport::PdfNotes *notes) const
+{
+    kareport::PdfOptions options;
+    options.page = {geometry_.pageSize, geometry_.resolution, margins_, fontSize_, GetLinesPerPage()};
+    options.lineCount = GetLineCount();
+    const kareport::ReportText &text = page_.text();
+    return text.isNarrow() ? kareport::writePdf(device, text.narrowView(), options, notes)
+                           : kareport::writePdf(device, text.view(), options, notes);
+}
+
+int UReportDoc::SaveFile(const QString &path)
+{
+    if (path.isEmpty()) {
+        return 0;
+    }
+    OnSaveDocument(path);
+    return 1;
+}
+
+QString UReportDoc::GetCurrentReportFileName() const
+{
+    // One for all reports, so that no two of them get one name.
+    static kareport::TemporaryNames names;
+    return names.next(GetTempDir(false), kareport::temporaryStem(reportFileName_));
+}
+
+void UReportDoc::SetTextObject(void *object, unsigned id)
+{
+    textObject_ = object;
+    textObjectId_ = id;
+}
+
+void UReportDoc::SaveText()
+{
+    if (textObjectId_ == 0 || textObject_ == nullptr) {
+        return;
+    }
+    QString edited;
+    for (UView *view : reportViews(*this)) {
+        QBuffer bytes;
+        bytes.open(QIODevice::WriteOnly);
+        if (dynamic_cast<const kareport::ReportViewPort *>(view)->streamPlainText(bytes) && bytes.size() > 0) {
+            // The receiving side expects the bytes of the plain text two to a character.
+            edited = kareport::textOfBytes(bytes.data());
+        }
+    }
+    const QString text = kareport::wrappedText(kareport::printableText(edited));
+    if (text.isEmpty()) {
+        return;
+    }
+    UDocument *receiver = openDocument(textObject_);
+    if (receiver == nullptr) {
+        return;
+    }
+    if (!receiver->OnTextReceived(textObjectId_, text) || openDocument(textObject_) == nullptr) {
+        SetTextObject(nullptr, 0);
+    }
 }

@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # Installs the Debian packages that a task needs and that are not there yet.
 #
-#   scripts/packages.sh build|test|bench|fuzz [...]
+#   scripts/packages.sh build|test|office|bench|tidy|coverage [...]
 #
 # Every package stands here once, with the reason for it. Nothing is asked of apt when all are installed.
 set -euo pipefail
@@ -11,7 +11,9 @@ packages_build=(
     ccache                  # a second build in seconds
     qt6-base-dev            # text, files, JSON, settings, fonts, printing
     libcli11-dev            # the command line
-    fonts-dejavu-core       # the fixed-pitch face that a page is measured with
+    libhpdf-dev             # PDF
+    libfontconfig-dev       # where the faces of a PDF are
+    fonts-dejavu-core       # the fixed-pitch face that a page is measured with, and of a PDF
 )
 packages_test=(
     libgtest-dev            # tests
@@ -20,12 +22,20 @@ packages_test=(
     clang                   # second opinion on warnings, fuzz targets
     libclang-rt-14-dev      # run-time library of the fuzz targets
     python3                 # the check scripts
+    poppler-utils           # PDFs read back as text, as pictures, their fonts
+    qpdf                    # PDFs checked
+    fonts-liberation2       # a second fixed-pitch face
+    fonts-wqy-zenhei        # a face with CJK
+)
+packages_office=(
+    libreoffice-writer-nogui # rich text read by somebody else; the tests use it where it is installed
 )
 packages_bench=(
     libbenchmark-dev        # micro benchmarks
     mawk                    # compared against
     time                    # peak memory of a process
     python3                 # the whole-process runs
+    python3-reportlab       # PDF compared against
 )
 packages_tidy=(
     clang-tidy

@@ -87,7 +87,12 @@ class TestReportView : public UView, public kareport::ReportViewPort
 {
 public:
     void OnUpdate(UView *, long, void *) override { ++updates; }
+    bool streamRichText(QIODevice &device) const override { return device.write(richText) == richText.size(); }
+    bool streamPlainText(QIODevice &device) const override { return device.write(plainText) == plainText.size(); }
+
     int updates = 0;
+    QByteArray richText = "{\\rtf1 of the view}"; ///< what the view streams out
+    QByteArray plainText;
 };
 
 /// An application with the document template for reports. Reports that are still open are closed with it.

@@ -1,5 +1,7 @@
 #include "AppMessageBox.h"
 
+#include "StandardText.h"
+
 namespace
 {
 
@@ -14,6 +16,11 @@ kareport::MessageHandler &messageHandler()
 MessageAnswer AppMessageBox(const QString &text, MessageButtons buttons)
 {
     return messageHandler() ? messageHandler()(text, buttons) : MessageAnswer::Cancel;
+}
+
+MessageAnswer AppMessageBox(unsigned number, unsigned /*type*/, unsigned /*help*/)
+{
+    return AppMessageBox(kareport::standardText(number));
 }
 
 void kareport::setMessageHandler(MessageHandler handler)

@@ -23,6 +23,9 @@ enum class MessageAnswer
 /// Shows a message to the user through the host and waits for the answer. A program that has installed no handler shows
 /// nothing and gets `Cancel`, the answer that loses nothing.
 KAREPORT_EXPORT MessageAnswer AppMessageBox(const QString &text, MessageButtons buttons = MessageButtons::Ok);
+/// Shows one of the host's standard texts by its number. @param type, help  kind of the message and its help topic; this
+/// host has one kind and no topics
+KAREPORT_EXPORT MessageAnswer AppMessageBox(unsigned number, unsigned type, unsigned help);
 
 namespace kareport
 {

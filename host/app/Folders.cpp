@@ -1,6 +1,9 @@
 #include "Folders.h"
 
+#include "Profile.h"
+
 #include <QDir>
+#include <QFileInfo>
 #include <QStandardPaths>
 
 namespace
@@ -40,6 +43,17 @@ QString GetStartPathName()
 QString GetTempDir(bool /*reserved*/)
 {
     return QDir::tempPath();
+}
+
+QString GetInitialOpenDir(const QString &key)
+{
+    const QString folder = GetProfileString(QString(), key);
+    return QFileInfo(folder).isDir() ? folder : QString();
+}
+
+void SetLastOpenDir(const QString &path, const QString &key)
+{
+    WriteProfileString(QString(), key, QFileInfo(path).absolutePath());
 }
 
 namespace kareport

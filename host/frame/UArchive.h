@@ -29,6 +29,8 @@ public:
     /// Writes bytes. A failed write is remembered: `IsGood` answers false from then on.
     void Write(QByteArrayView bytes);
     bool IsGood() const { return good_; }
+    /// Gives the storing or loading up: `IsGood` answers false from then on.
+    void Abandon() { good_ = false; }
 
 private:
     QIODevice &device_;

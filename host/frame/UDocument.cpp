@@ -215,3 +215,8 @@ void UDocument::DeleteContents() {}
 void UDocument::OnDocumentEvent(DocumentEvent /*event*/) {}
 
 void UDocument::OnReportClosed(UDocument * /*report*/) {}
+
+bool UDocument::OnTextReceived(unsigned /*id*/, const QString & /*text*/)
+{
+    return false;
+}

@@ -82,6 +82,9 @@ public:
 
     /// Tells the document that a report it had asked for has been closed and is about to go.
     virtual void OnReportClosed(UDocument *report);
+    /// Takes the text that the user has written for one of the document's objects.
+    /// @return false when the document has no such object (any more)
+    virtual bool OnTextReceived(unsigned id, const QString &text);
 
     UDocTemplate *GetDocTemplate() const { return docTemplate_; }
 

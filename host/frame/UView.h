@@ -2,6 +2,8 @@
 
 #include "KaReportExport.h"
 
+#include <QtGlobal>
+
 class CViewPane;
 class UDocument;
 
@@ -13,6 +15,9 @@ public:
     virtual ~UView();
     UView(const UView &) = delete;
     UView &operator=(const UView &) = delete;
+
+    /// The longest file in bytes that a view of text takes.
+    static constexpr qint64 nMaxSize = 0x3FFFFFFF;
 
     UDocument *GetDocument() const { return document_; }
     /// The pane that shows the view; null for a view without one.

@@ -1,0 +1,45 @@
+#pragma once
+
+#include "PdfFaces.h"
+
+#include <QByteArray>
+
+#include <hpdf.h>
+
+#include <vector>
+
+class QIODevice;
+
+namespace kareport
+{
+
+/// A PDF in the making. The first error of the library ends it: what is asked afterwards answers false.
+class PdfDocument
+{
+public:
+    PdfDocument();
+    ~PdfDocument();
+    PdfDocument(const PdfDocument &) = delete;
+    PdfDocument &operator=(const PdfDocument &) = delete;
+
+    bool isGood() const { return document_ != nullptr && error_ == HPDF_OK; }
+    /// The library's number of the first error; 0 without one.
+    HPDF_STATUS error() const { return error_; }
+
+    /// Prepares for so many pages. To be called before the first page.
+    bool expectPages(qint64 pages);
+    /// Embeds a face for texts in UTF-8. @return null when the file is missing or is no font
+    HPDF_Font loadFace(const PdfFace &face);
+    /// @return null after an error
+    HPDF_Page addPage();
+    /// Writes the finished document to an open device. @return false after an error of the library or of the device
+    bool save(QIODevice &device);
+
+private:
+    static void noteError(HPDF_STATUS error, HPDF_STATUS detail, void *self);
+
+    HPDF_Doc document_;
+    HPDF_STATUS error_ = HPDF_OK;
+};
+
+} // namespace kareport

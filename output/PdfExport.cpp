@@ -1,0 +1,203 @@
+#include "PdfExport.h"
+
+#include "LineBreaker.h"
+#include "PdfDocument.h"
+#include "PdfText.h"
+#include "PdfTypesetter.h"
+#include "Xlate.h"
+
+#include <algorithm>
+#include <deque>
+
+namespace kareport
+{
+
+namespace
+{
+
+/// Writes one text as a PDF.
+template <typename Text>
+class PdfExport
+{
+public:
+    PdfExport(Text text, const PdfOptions &options, PdfNotes &notes) : text_(text), options_(options), notes_(notes) {}
+
+    bool write(QIODevice &device)
+    {
+        const PdfPageSetup &setup = options_.page;
+        if (setup.resolution == 0 || setup.linesPerPage < 1) {
+            return fail(Xlate("the page has not been measured"));
+        }
+        box_ = pdfPageBox(setup);
+        if (!loadFaces()) {
+            return false;
+        }
+        const qint64 pages = std::max<qint64>(0, (options_.lineCount - 1 + setup.linesPerPage) / setup.linesPerPage);
+        if (!pdf_.expectPages(std::max(pages, pagesOfText())) || !addPages(pages)) {
+            return fail(libraryError());
+        }
+        // A device that fails says why itself.
+        return pdf_.save(device) || (pdf_.isGood() ? false : fail(libraryError()));
+    }
+
+private:
+    bool fail(const QString &problem)
+    {
+        if (notes_.problem.isEmpty()) {
+            notes_.problem = problem;
+        }
+        return false;
+    }
+
+    QString libraryError() const
+    {
+        return Xlate("the PDF library failed with error %1")
+            .arg(QStringLiteral("0x%1").arg(QString::number(pdf_.error(), 16).toUpper()));
+    }
+
+    bool loadFaces()
+    {
+        const std::vector<CharacterCount> characters = visibleCharacters(text_);
+        const auto preferred = preferredPdfFace(options_.fontFolders.value_or(systemFontFolders()));
+        const std::vector<PdfFace> faces = choosePdfFaces(preferred, fixedPitchPdfFaces(), characters);
+        if (faces.empty()) {
+            return fail(Xlate("no fixed-pitch font was found: DejaVu Sans Mono, Liberation Mono or Hack was expected"));
+        }
+        if (!typesetter_.loadFaces(pdf_, faces)) {
+            return fail(Xlate("the font file \"%1\" cannot be used").arg(typesetter_.failedFace()));
+        }
+        for (const CharacterCount &entry : characters) {
+            if (!typesetter_.covers(entry.character)) {
+                uncovered_.push_back(entry.character);
+            } else {
+                widest_ = std::max(widest_, typesetter_.width(entry.character));
+            }
+        }
+        substitute_ =
+            typesetter_.covers(QChar::ReplacementCharacter) ? QChar(QChar::ReplacementCharacter) : QChar(u'?');
+        widest_ = std::max(widest_, typesetter_.width(substitute_.unicode()));
+        return true;
+    }
+
+    qint64 pagesOfText() const
+    {
+        return std::count(text_.begin(), text_.end(), typename Text::value_type('\n')) / options_.page.linesPerPage + 1;
+    }
+
+    bool addPages(qint64 pages)
+    {
+        qsizetype begin = 0;
+        // An edited text may have more lines than were counted when it was written; they get their pages, too.
+        for (qint64 page = 0; page < pages || begin < text_.size(); ++page) {
+            const qsizetype end = pageEnd(text_, begin, options_.page.linesPerPage);
+            if (!addPage(begin, end)) {
+                return false;
+            }
+            begin = end;
+            if (options_.progress && !options_.progress(page + 1, pages)) {
+                return fail(Xlate("stopped"));
+            }
+        }
+        return true;
+    }
+
+    bool addPage(qsizetype begin, qsizetype end)
+    {
+        const double width = (double(box_.right) - double(box_.left)) * 1000 / options_.page.fontSize;
+        pieces_.clear();
+        std::size_t line = 0;
+        for (qsizetype at = begin; at < end; ++line) {
+            const qsizetype feed = text_.indexOf(u'\n', at);
+            const qsizetype lineEnd = feed < 0 || feed >= end ? end : feed;
+            if (line == lines_.size()) {
+                lines_.emplace_back();
+            }
+            QString &visible = lines_[line];
+            visibleLine(text_.sliced(at, lineEnd - at), visible);
+            ++lineNumber_;
+            replaceUncovered(visible);
+            if (double(visible.size()) * widest_ <= width) {
+                pieces_.push_back(visible);
+            } else {
+                breakLine(
+                    visible, width, [this](char32_t c) { return typesetter_.width(c); }, pieces_);
+            }
+            at = lineEnd + 1;
+        }
+        return typesetter_.addPage(
+            pdf_, box_, placeLines(options_.page, box_, typesetter_.height(), qsizetype(pieces_.size())), pieces_);
+    }
+
+    void replaceUncovered(QString &line)
+    {
+        if (uncovered_.empty()) {
+            return;
+        }
+        QString shown;
+        for (const char32_t character : line.toUcs4()) {
+            if (!std::binary_search(uncovered_.begin(), uncovered_.end(), character)) {
+                shown += QChar::fromUcs4(character);
+                continue;
+            }
+            if (QChar::category(character) == QChar::Other_Format) {
+                continue; // a mark that is not seen where it is known either
+            }
+            shown += substitute_;
+            const auto known =
+                std::find_if(notes_.missing.begin(), notes_.missing.end(),
+                             [character](const MissingCharacter &m) { return m.character == character; });
+            if (known != notes_.missing.end()) {
+                ++known->count;
+            } else {
+                notes_.missing.push_back({character, 1, lineNumber_});
+            }
+        }
+        line = shown;
+    }
+
+    Text text_;
+    const PdfOptions &options_;
+    PdfNotes &notes_;
+    PdfDocument pdf_;
+    PdfTypesetter typesetter_;
+    PdfPageBox box_;
+    int widest_ = 0;
+    std::vector<char32_t> uncovered_; ///< in order
+    QChar substitute_;
+    qint64 lineNumber_ = 0;
+    std::deque<QString> lines_; ///< of the page at hand, used again for every page
+    std::vector<QStringView> pieces_;
+};
+
+template <typename Text>
+bool writeText(QIODevice &device, Text text, const PdfOptions &options, PdfNotes *notes)
+{
+    PdfNotes own;
+    return PdfExport<Text>(text, options, notes != nullptr ? *notes : own).write(device);
+}
+
+} // namespace
+
+QStringList PdfNotes::warnings() const
+{
+    QStringList texts;
+    for (const MissingCharacter &entry : missing) {
+        const QString code = QString::number(entry.character, 16).toUpper().rightJustified(4, u'0');
+        texts += Xlate("no font has the character \"%1\" (U+%2), first in line %3, %4 times in all")
+                     .arg(QString::fromUcs4(&entry.character, 1), code, QString::number(entry.firstLine),
+                          QString::number(entry.count));
+    }
+    return texts;
+}
+
+bool writePdf(QIODevice &device, QStringView text, const PdfOptions &options, PdfNotes *notes)
+{
+    return writeText(device, text, options, notes);
+}
+
+bool writePdf(QIODevice &device, QLatin1StringView text, const PdfOptions &options, PdfNotes *notes)
+{
+    return writeText(device, text, options, notes);
+}
+
+} // namespace kareport

@@ -1,0 +1,172 @@
+#include "PdfFaces.h"
+
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
+
+#include <fontconfig/fontconfig.h>
+
+#include <algorithm>
+#include <array>
+
+namespace kareport
+{
+
+namespace
+{
+
+using PatternOwner = std::unique_ptr<FcPattern, decltype(&FcPatternDestroy)>;
+using FontSetOwner = std::unique_ptr<FcFontSet, decltype(&FcFontSetDestroy)>;
+using ObjectSetOwner = std::unique_ptr<FcObjectSet, decltype(&FcObjectSetDestroy)>;
+
+const FcChar8 *fcText(const QByteArray &text)
+{
+    return reinterpret_cast<const FcChar8 *>(text.constData());
+}
+
+/// The upright regular face of a family; nothing where the system does not have it as a TrueType file.
+std::optional<PdfFace> faceOfFamily(const char *family)
+{
+    const PatternOwner pattern(FcPatternCreate(), &FcPatternDestroy);
+    FcPatternAddString(pattern.get(), FC_FAMILY, reinterpret_cast<const FcChar8 *>(family));
+    FcPatternAddInteger(pattern.get(), FC_SLANT, FC_SLANT_ROMAN);
+    FcPatternAddString(pattern.get(), FC_FONTFORMAT, reinterpret_cast<const FcChar8 *>("TrueType"));
+    const ObjectSetOwner wanted(FcObjectSetBuild(FC_FILE, FC_INDEX, FC_WEIGHT, nullptr), &FcObjectSetDestroy);
+    const FontSetOwner found(FcFontList(nullptr, pattern.get(), wanted.get()), &FcFontSetDestroy);
+
+    struct Found
+    {
+        QString file;
+        int index;
+    };
+    std::optional<Found> best;
+    for (int i = 0; found && i < found->nfont; ++i) {
+        FcChar8 *file = nullptr;
+        int index = 0;
+        int weight = 0;
+        if (FcPatternGetString(found->fonts[i], FC_FILE, 0, &file) != FcResultMatch ||
+            FcPatternGetInteger(found->fonts[i], FC_INDEX, 0, &index) != FcResultMatch ||
+            FcPatternGetInteger(found->fonts[i], FC_WEIGHT, 0, &weight) != FcResultMatch || weight < FC_WEIGHT_BOOK ||
+            weight > FC_WEIGHT_MEDIUM)
+        {
+            continue;
+        }
+        // Of several files the first by name is taken, so that the choice does not hang on the order of a folder.
+        const QString name = QFile::decodeName(reinterpret_cast<const char *>(file));
+        if (!best || name < best->file) {
+            best = Found{name, index};
+        }
+    }
+    if (!best) {
+        return std::nullopt;
+    }
+    return PdfFace(best->file, static_cast<unsigned>(best->index) & 0xFFFF,
+                   best->file.endsWith(u".ttc", Qt::CaseInsensitive));
+}
+
+} // namespace
+
+struct PdfFace::Coverage
+{
+    PatternOwner pattern{nullptr, &FcPatternDestroy};
+    FcCharSet *characters = nullptr; ///< owned by the pattern
+};
+
+PdfFace::PdfFace(QString file, unsigned index, bool isCollection)
+    : file_(std::move(file)), index_(index), isCollection_(isCollection)
+{
+    auto coverage = std::make_shared<Coverage>();
+    const QByteArray name = QFile::encodeName(file_);
+    int count = 0;
+    coverage->pattern.reset(FcFreeTypeQuery(fcText(name), index_, nullptr, &count));
+    if (coverage->pattern) {
+        FcPatternGetCharSet(coverage->pattern.get(), FC_CHARSET, 0, &coverage->characters);
+    }
+    coverage_ = std::move(coverage);
+}
+
+bool PdfFace::covers(char32_t character) const
+{
+    return character <= 0xFFFF && coverage_->characters != nullptr &&
+           FcCharSetHasChar(coverage_->characters, character) == FcTrue;
+}
+
+QStringList systemFontFolders()
+{
+    QStringList folders;
+    FcStrList *list = FcConfigGetFontDirs(nullptr);
+    while (const FcChar8 *folder = list != nullptr ? FcStrListNext(list) : nullptr) {
+        folders.append(QFile::decodeName(reinterpret_cast<const char *>(folder)));
+    }
+    if (list != nullptr) {
+        FcStrListDone(list);
+    }
+    return folders;
+}
+
+std::optional<PdfFace> preferredPdfFace(const QStringList &fontFolders)
+{
+    struct Row
+    {
+        QStringView name;
+        bool isCollection;
+    };
+    static constexpr Row rows[] = {{u"MSGOTHIC.TTC", true}, {u"lucon.TTF", false}};
+    for (const Row &row : rows) {
+        for (const QString &folder : fontFolders) {
+            // A name filter ignores case, as the platform does that these files come from.
+            const QStringList files = QDir(folder).entryList({row.name.toString()}, QDir::Files, QDir::Name);
+            if (!files.isEmpty()) {
+                return PdfFace(QDir(folder).filePath(files.first()), 0, row.isCollection);
+            }
+        }
+    }
+    return std::nullopt;
+}
+
+std::vector<PdfFace> fixedPitchPdfFaces()
+{
+    // These draw their composite glyphs right when they are embedded; not every fixed-pitch face does.
+    static constexpr const char *families[] = {"DejaVu Sans Mono", "Liberation Mono", "Hack", "WenQuanYi Zen Hei Mono",
+                                               "WenQuanYi Zen Hei"};
+    std::vector<PdfFace> faces;
+    for (const char *family : families) {
+        if (auto face = faceOfFamily(family)) {
+            faces.push_back(std::move(*face));
+        }
+    }
+    return faces;
+}
+
+std::vector<PdfFace> choosePdfFaces(const std::optional<PdfFace> &preferred, const std::vector<PdfFace> &others,
+                                    const std::vector<CharacterCount> &characters)
+{
+    std::vector<PdfFace> chosen;
+    std::vector<CharacterCount> left = characters;
+    const auto take = [&](const PdfFace &face) {
+        chosen.push_back(face);
+        std::erase_if(left, [&face](const CharacterCount &entry) { return face.covers(entry.character); });
+    };
+    const auto covered = [&left](const PdfFace &face) {
+        qint64 count = 0;
+        for (const CharacterCount &entry : left) {
+            count += face.covers(entry.character) ? entry.count : 0;
+        }
+        return count;
+    };
+    if (preferred) {
+        take(*preferred);
+    }
+    while (!others.empty() && (chosen.empty() || !left.empty())) {
+        // The first of those that show most: the order of the faces decides where several show all.
+        const auto best = std::max_element(others.begin(), others.end(),
+                                           [&](const PdfFace &a, const PdfFace &b) { return covered(a) < covered(b); });
+        if (!chosen.empty() && covered(*best) == 0) {
+            break;
+        }
+        take(*best);
+    }
+    return chosen;
+}
+
+} // namespace kareport

@@ -1,0 +1,61 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QString>
+#include <QStringList>
+
+#include <memory>
+#include <optional>
+#include <vector>
+
+namespace kareport
+{
+
+/// A font file of the system that a PDF can embed.
+class KAREPORT_EXPORT PdfFace
+{
+public:
+    /// Reads what a file covers. A file that is no font covers nothing and is refused when it is embedded.
+    PdfFace(QString file, unsigned index, bool isCollection);
+
+    const QString &file() const { return file_; }
+    unsigned index() const { return index_; } ///< of the face in a collection, from 0
+    bool isCollection() const { return isCollection_; }
+    /// Whether the face has a glyph that a PDF can show: nothing beyond U+FFFF is.
+    bool covers(char32_t character) const;
+
+private:
+    struct Coverage;
+
+    QString file_;
+    unsigned index_;
+    bool isCollection_;
+    std::shared_ptr<const Coverage> coverage_;
+};
+
+/// The folders that the system's fonts are in.
+KAREPORT_EXPORT QStringList systemFontFolders();
+
+/// The face that stands first, whatever a report holds, where the system has it: MSGOTHIC.TTC or else lucon.TTF.
+KAREPORT_EXPORT std::optional<PdfFace> preferredPdfFace(const QStringList &fontFolders);
+/// The fixed-pitch faces of the system in the order in which they are tried, collections with CJK last.
+KAREPORT_EXPORT std::vector<PdfFace> fixedPitchPdfFaces();
+
+/// A character of a text and how often it occurs there.
+struct CharacterCount
+{
+    char32_t character = 0;
+    qint64 count = 0;
+};
+
+/// The faces that a text is shown with: the one that it is set in comes first, and the others hold what that one lacks.
+/// Only faces that the text needs are among them; none where the system has no face at all.
+/// @param preferred   stands first whatever it covers
+/// @param others      in the order of preference; the first of those that show most of the text stands first otherwise
+/// @param characters  every character of the text once
+KAREPORT_EXPORT std::vector<PdfFace> choosePdfFaces(const std::optional<PdfFace> &preferred,
+                                                    const std::vector<PdfFace> &others,
+                                                    const std::vector<CharacterCount> &characters);
+
+} // namespace kareport

@@ -1,0 +1,56 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QMargins>
+#include <QSize>
+
+namespace kareport
+{
+
+/// The printed page that a PDF shows.
+struct PdfPageSetup
+{
+    QSize pageSize;          ///< whole sheet, printer dots
+    unsigned resolution = 0; ///< dots per inch; 0: the page has not been measured, and nothing can be written
+    QMargins margins;        ///< hundredths of a millimetre
+    unsigned fontSize = 0;   ///< points
+    int linesPerPage = 0;    ///< 1 or more
+};
+
+/// A page and the box of its text in PDF points, counted from the sheet's lower left corner.
+struct PdfPageBox
+{
+    float width = 0;
+    float height = 0;
+    float left = 0;
+    float top = 0;
+    float right = 0;
+    float bottom = 0;
+};
+
+/// How far a face reaches above and below its baseline, in thousandths of the font size; below is negative.
+struct FaceHeight
+{
+    float ascent = 0;
+    float descent = 0;
+};
+
+/// Where the lines of a page stand.
+struct LinePlacement
+{
+    float fontSize = 0;      ///< points
+    float leading = 0;       ///< points from baseline to baseline
+    float firstBaseline = 0; ///< points from the sheet's lower edge
+};
+
+KAREPORT_EXPORT PdfPageBox pdfPageBox(const PdfPageSetup &setup);
+
+/// Places the lines of a page in its box: as far apart as the face is high or, where a page's lines do not fit then, as
+/// close as they have to be. A page with more lines than that, because some had to be broken, is made smaller as a whole, so
+/// that its lines stay apart.
+/// @param lines  lines that the page has after breaking
+KAREPORT_EXPORT LinePlacement placeLines(const PdfPageSetup &setup, const PdfPageBox &box, const FaceHeight &face,
+                                         qsizetype lines);
+
+} // namespace kareport

@@ -1,0 +1,41 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QByteArray>
+#include <QStringView>
+
+#include <array>
+
+class QIODevice;
+
+namespace kareport
+{
+
+/// Reads a text file in lines as a document loads it: one character a byte, CR LF as LF, and lines of more than 1022
+/// characters in pieces.
+class KAREPORT_EXPORT ReportFileReader
+{
+public:
+    static constexpr qsizetype longestPiece = 1022;
+
+    /// The device must be open and live as long as the reader.
+    explicit ReportFileReader(QIODevice &device) : device_(device) {}
+
+    /// Reads a line with its LF, or the next piece of a long one. @return false at the end of the file
+    bool next();
+    /// What was read, until the next call.
+    QStringView piece() const { return QStringView(characters_.data(), size_); }
+
+private:
+    void fill();
+
+    QIODevice &device_;
+    QByteArray bytes_;
+    qsizetype at_ = 0;
+    bool atEnd_ = false;
+    std::array<char16_t, longestPiece> characters_{};
+    qsizetype size_ = 0;
+};
+
+} // namespace kareport

@@ -1,0 +1,99 @@
+#include "RichTextImage.h"
+
+#include <cstddef>
+
+namespace kareport
+{
+
+namespace
+{
+
+const QString placeholder = QStringLiteral("RTF Data");
+
+/// The document that a style's template is cut from.
+const QString sources[] = {
+    QStringLiteral("{\\rtf1\\ansi\\ansicpg1252\\deff0\\deflang1033{\\fonttbl{\\f1\\fnil\\fcharset0 Lucida Console;}}"
+                   "\\viewkind4\\uc1\\pard\\f1\\fs18 <<RTF Data>> }"),
+    QStringLiteral("{\\rtf1\\ansi\\ansicpg1252\\deff0\\deflang1033{\\fonttbl{\\f1\\fnil\\fcharset0 Lucida Console;}}"
+                   "\\viewkind4\\uc1\\pard\\b\\f1\\fs18 <<RTF Data>>\\b0 }"),
+    QStringLiteral("{\\rtf1\\ansi\\ansicpg1252\\deff0\\deflang1033{\\fonttbl{\\f1\\fnil\\fcharset0 Lucida Console;}}"
+                   "\\viewkind4\\uc1\\pard\\ul\\f1\\fs18 <<RTF Data>>\\ulnone }"),
+    QStringLiteral("{\\rtf1\\ansi\\ansicpg1252\\deff0\\deflang1033{\\fonttbl{\\f1\\fnil\\fcharset0 Lucida Console;}}"
+                   "\\viewkind4\\uc1\\pard\\ul\\b\\f1\\fs18 <<RTF Data>>\\ulnone\\b0 }"),
+};
+
+} // namespace
+
+bool RichTextImage::cutToParagraph(QString &document)
+{
+    const qsizetype begin = document.indexOf(u"\\viewkind");
+    if (begin < 1) {
+        return false;
+    }
+    const qsizetype end = document.indexOf(u'}', begin);
+    if (end <= begin) {
+        return false;
+    }
+    document = document.sliced(begin, end - begin);
+    return true;
+}
+
+QString RichTextImage::fontTable(const QString &fontName, unsigned fontSize)
+{
+    return QStringLiteral("{\\fonttbl{\\f") + QString::number(fontSize) + QStringLiteral("\\fnil\\fcharset0 ") +
+           fontName + QStringLiteral(";}}");
+}
+
+void RichTextImage::setOn(bool on)
+{
+    on_ = on;
+    if (!on) {
+        return;
+    }
+    const QString key = QStringLiteral("<<%1>>").arg(placeholder);
+    for (std::size_t style = 0; style < templates_.size(); ++style) {
+        QString paragraph = sources[style];
+        cutToParagraph(paragraph);
+        const qsizetype at = paragraph.indexOf(key);
+        templates_[style] = {paragraph.first(at), paragraph.sliced(at + key.size())};
+    }
+}
+
+void RichTextImage::write(QStringView text, int style, Form form)
+{
+    if (!on_) {
+        return;
+    }
+    if (form == Form::BareText) {
+        pieces_ += text;
+        return;
+    }
+    if (text.isEmpty()) {
+        pieces_ += u"\\par";
+        return;
+    }
+    if (style < 0 || style >= int(templates_.size())) {
+        return;
+    }
+    const ParagraphTemplate &paragraph = templates_[static_cast<std::size_t>(style)];
+    pieces_ += paragraph.before;
+    pieces_ += text;
+    pieces_ += paragraph.behind;
+}
+
+QString RichTextImage::document(const QString &fontName, unsigned fontSize, Form form) const
+{
+    if (form == Form::BareText) {
+        return pieces_;
+    }
+    const QString head =
+        QStringLiteral("{\\rtf1\\ansi\\ansicpg1252\\deff0\\deflang1033") + fontTable(fontName, fontSize);
+    QString document;
+    document.reserve(head.size() + pieces_.size() + 1);
+    document += head;
+    document += pieces_;
+    document += u'}';
+    return document;
+}
+
+} // namespace kareport

@@ -1,0 +1,52 @@
+#pragma once
+
+#include "KaReportExport.h"
+#include "TextPlaces.h"
+
+#include <QByteArrayView>
+#include <QString>
+#include <QStringList>
+#include <QStringView>
+
+#include <optional>
+
+class QTextDocument;
+
+namespace kareport
+{
+
+/// What a rich text holds that is not shown.
+struct KAREPORT_EXPORT RichTextNotes
+{
+    int pictures = 0;
+    int objects = 0;   ///< embedded or linked; the text that stands in for one is shown
+    int footnotes = 0; ///< and endnotes and annotations
+    int headers = 0;   ///< page headers and footers
+
+    /// A sentence for a person about each kind that was passed over; empty where all is shown.
+    QStringList texts() const;
+};
+
+/// Why a rich text could not be read to its end.
+struct RichTextError
+{
+    TextPlace place; ///< lines end with LF; columns are bytes of a file, or characters of a text
+    QString text;    ///< one sentence that says what was expected
+};
+
+/// Whether the bytes or the text begin as a rich text does: with "{\rtf".
+KAREPORT_EXPORT bool isRichText(QByteArrayView bytes);
+KAREPORT_EXPORT bool isRichText(QStringView text);
+
+/// Reads the bytes of a rich-text file (RTF) into a document, whose content is replaced. Bytes from 0x80 on are read in the
+/// code page of the current font, else of the file. What stands behind the end of the outermost group is not read.
+/// Headers, footers, notes, pictures and objects are passed over and counted in `notes`.
+/// The document keeps no undo steps of what is read.
+/// @return what is wrong, the document then holds what was read up to there; nothing where all was read
+KAREPORT_EXPORT std::optional<RichTextError> readRichText(QByteArrayView bytes, QTextDocument &document,
+                                                          RichTextNotes *notes = nullptr);
+/// The same for a rich text in memory, in which characters from U+0080 on stand for themselves.
+KAREPORT_EXPORT std::optional<RichTextError> readRichText(QStringView text, QTextDocument &document,
+                                                          RichTextNotes *notes = nullptr);
+
+} // namespace kareport

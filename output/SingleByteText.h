@@ -1,0 +1,23 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QStringView>
+
+class QIODevice;
+
+namespace kareport
+{
+
+/// What stands for a character that has no byte of its own.
+enum class WideCharacters
+{
+    RichTextEscape, ///< `\uN?` for each UTF-16 unit, N as a signed number, as rich text has it
+    QuestionMark    ///< "?" for each character
+};
+
+/// Writes a text to an open device with one byte a character up to U+00FF, and each LF as CR LF.
+/// @return false as soon as a write fails
+KAREPORT_EXPORT bool writeSingleByteText(QIODevice &device, QStringView text, WideCharacters wide);
+
+} // namespace kareport

@@ -1,0 +1,28 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QSet>
+#include <QString>
+
+namespace kareport
+{
+
+/// The stem of the temporary files of a report: its own name without the last three letters, or "Report$$$".
+KAREPORT_EXPORT QString temporaryStem(const QString &reportFileName);
+
+/// Names for temporary report files. Each is handed out once; what the file system holds is not looked at.
+class KAREPORT_EXPORT TemporaryNames
+{
+public:
+    /// The first name in a folder that has not been handed out: the stem, then the stem with a number from 2 on. When
+    /// all up to 1000 have been, the last one is given again.
+    QString next(const QString &folder, const QString &stem);
+
+private:
+    static constexpr int lastNumber = 1000;
+
+    QSet<QString> handedOut_;
+};
+
+} // namespace kareport

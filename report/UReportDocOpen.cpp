@@ -1,0 +1,107 @@
+#include "UReportDoc.h"
+
+#include "AppMessageBox.h"
+#include "ReportFileReader.h"
+#include "RichTextReader.h"
+#include "StandardText.h"
+#include "UArchive.h"
+#include "UView.h"
+
+#include <QFile>
+
+namespace
+{
+
+/// The word that the first line of a report begins with.
+constexpr QStringView firstWord = u"TALVEN";
+
+/// The most of a file's first line that is looked at to tell what it is.
+constexpr qint64 longestProbe = 64 * 1024;
+
+/// Whether a file may be rich text by its name.
+bool namesRichText(const QString &path)
+{
+    return path.indexOf(u".rtf", 0, Qt::CaseInsensitive) > 0;
+}
+
+bool holdsRichText(const QString &path)
+{
+    QFile file(path);
+    return file.open(QIODevice::ReadOnly) && kareport::isRichText(file.readLine(longestProbe).trimmed());
+}
+
+} // namespace
+
+bool UReportDoc::OnOpenDocument(const QString &path)
+{
+    openedFromRtf_ = namesRichText(path);
+    if (!UDocument::OnOpenDocument(path)) {
+        return false;
+    }
+    SetPageSize();
+    return true;
+}
+
+void UReportDoc::Serialize(UArchive &archive)
+{
+    if (archive.IsStoring()) {
+        // As many bytes as the text has characters, which is the first half of it: what reads such archives counts on
+        // that length.
+        archive.Write(QByteArrayView(reinterpret_cast<const char *>(GetData()), GetText().size()));
+        return;
+    }
+    if (!GetViews().empty() && archive.GetLength() > UView::nMaxSize) {
+        AppMessageBox(kareport::fileTooLarge, 0, unsigned(-1));
+        archive.Abandon();
+        return;
+    }
+    if (GetRTFDataFlag()) {
+        return;
+    }
+    const bool headerFlag = GetHeaderFlag();
+    SetHeaderFlag(false);
+    isSerializing_ = true;
+    LoadFile(archive.GetFilePath(), true);
+    isSerializing_ = false;
+    SetHeaderFlag(headerFlag);
+}
+
+int UReportDoc::LoadFile(const QString &path, bool keepLineEnds)
+{
+    if (path.isEmpty()) {
+        return 0;
+    }
+    // Rich text is opened as a document; its source is what is loaded then.
+    if (!isSerializing_ && namesRichText(path) && holdsRichText(path)) {
+        OnOpenDocument(path);
+        return 1;
+    }
+    QFile file(path);
+    if (!file.open(QIODevice::ReadOnly)) {
+        return 0;
+    }
+    kareport::ReportFileReader reader(file);
+    bool isRichText = false;
+    bool isFirst = true;
+    while (reader.next()) {
+        QStringView line = reader.piece();
+        if (std::exchange(isFirst, false)) {
+            isRichText = namesRichText(path) && kareport::isRichText(line.trimmed());
+        }
+        if (isRichText && !line.endsWith(u'\n')) {
+            // A line end between the pieces of a long line could cut a control word in two.
+            page_.write(line, 0);
+            continue;
+        }
+        if (!keepLineEnds && line.endsWith(u'\n')) {
+            line.chop(1);
+        }
+        if (GetLineCount() == 0 && line.indexOf(firstWord) > 0) {
+            line = line.sliced(line.indexOf(firstWord));
+        }
+        page_.writeLine(line, 0, 1, 0);
+        page_.countLine();
+    }
+    UpdateAllViews(nullptr, 0, nullptr);
+    return 1;
+}
