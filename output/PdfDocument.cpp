@@ -3,7 +3,8 @@
 #include <QFile>
 #include <QIODevice>
 
-#include <memory>
+#include <algorithm>
+#include <array>
 
 namespace kareport
 {
@@ -74,15 +75,17 @@ bool PdfDocument::save(QIODevice &device)
     if (!isGood() || HPDF_SaveToStream(document_) != HPDF_OK || !isGood()) {
         return false;
     }
-    HPDF_UINT32 size = HPDF_GetStreamSize(document_);
-    if (size == 0) {
-        return false;
+    // Piece by piece: the library holds the whole of it already.
+    HPDF_UINT32 left = HPDF_GetStreamSize(document_);
+    std::array<HPDF_BYTE, 64 * 1024> piece;
+    bool isWritten = left > 0;
+    while (isWritten && left > 0) {
+        HPDF_UINT32 size = std::min(left, static_cast<HPDF_UINT32>(piece.size()));
+        left -= size;
+        isWritten = HPDF_ReadFromStream(document_, piece.data(), &size) == HPDF_OK &&
+                    device.write(reinterpret_cast<const char *>(piece.data()), size) == qint64(size);
     }
-    const std::unique_ptr<HPDF_BYTE[]> bytes(new (std::nothrow) HPDF_BYTE[size]);
-    if (!bytes || HPDF_ReadFromStream(document_, bytes.get(), &size) != HPDF_OK) {
-        return false;
-    }
-    return device.write(reinterpret_cast<const char *>(bytes.get()), size) == qint64(size);
+    return isWritten;
 }
 
 } // namespace kareport

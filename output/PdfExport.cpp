@@ -33,7 +33,9 @@ public:
             return false;
         }
         const qint64 pages = std::max<qint64>(0, (options_.lineCount - 1 + setup.linesPerPage) / setup.linesPerPage);
-        if (!pdf_.expectPages(std::max(pages, pagesOfText())) || !addPages(pages)) {
+        const qint64 lines = linesOfText();
+        linesToFit_ = linesToFit(setup, box_, typesetter_.height(), lines);
+        if (!pdf_.expectPages(std::max(pages, lines / setup.linesPerPage + 1)) || !addPages(pages)) {
             return fail(libraryError());
         }
         // A device that fails says why itself.
@@ -79,10 +81,7 @@ private:
         return true;
     }
 
-    qint64 pagesOfText() const
-    {
-        return std::count(text_.begin(), text_.end(), typename Text::value_type('\n')) / options_.page.linesPerPage + 1;
-    }
+    qint64 linesOfText() const { return std::count(text_.begin(), text_.end(), typename Text::value_type('\n')) + 1; }
 
     bool addPages(qint64 pages)
     {
@@ -124,8 +123,9 @@ private:
             }
             at = lineEnd + 1;
         }
-        return typesetter_.addPage(
-            pdf_, box_, placeLines(options_.page, box_, typesetter_.height(), qsizetype(pieces_.size())), pieces_);
+        const LinePlacement placement =
+            placeLines(options_.page, box_, typesetter_.height(), linesToFit_, qsizetype(pieces_.size()));
+        return typesetter_.addPage(pdf_, box_, placement, pieces_);
     }
 
     void replaceUncovered(QString &line)
@@ -161,6 +161,7 @@ private:
     PdfDocument pdf_;
     PdfTypesetter typesetter_;
     PdfPageBox box_;
+    qsizetype linesToFit_ = 1; ///< on a page
     int widest_ = 0;
     std::vector<char32_t> uncovered_; ///< in order
     QChar substitute_;

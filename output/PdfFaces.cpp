@@ -7,10 +7,20 @@
 #include <fontconfig/fontconfig.h>
 
 #include <algorithm>
-#include <array>
 
 namespace kareport
 {
+
+struct PdfFace::Coverage
+{
+    ~Coverage()
+    {
+        if (characters != nullptr) {
+            FcCharSetDestroy(characters);
+        }
+    }
+    FcCharSet *characters = nullptr;
+};
 
 namespace
 {
@@ -24,6 +34,24 @@ const FcChar8 *fcText(const QByteArray &text)
     return reinterpret_cast<const FcChar8 *>(text.constData());
 }
 
+std::shared_ptr<const PdfFace::Coverage> coverageOf(const FcPattern *pattern)
+{
+    auto coverage = std::make_shared<PdfFace::Coverage>();
+    FcCharSet *characters = nullptr;
+    if (pattern != nullptr && FcPatternGetCharSet(pattern, FC_CHARSET, 0, &characters) == FcResultMatch) {
+        coverage->characters = FcCharSetCopy(characters);
+    }
+    return coverage;
+}
+
+std::shared_ptr<const PdfFace::Coverage> coverageOf(const QString &file, unsigned index)
+{
+    int count = 0;
+    const PatternOwner pattern(FcFreeTypeQuery(fcText(QFile::encodeName(file)), index, nullptr, &count),
+                               &FcPatternDestroy);
+    return coverageOf(pattern.get());
+}
+
 /// The upright regular face of a family; nothing where the system does not have it as a TrueType file.
 std::optional<PdfFace> faceOfFamily(const char *family)
 {
@@ -31,13 +59,15 @@ std::optional<PdfFace> faceOfFamily(const char *family)
     FcPatternAddString(pattern.get(), FC_FAMILY, reinterpret_cast<const FcChar8 *>(family));
     FcPatternAddInteger(pattern.get(), FC_SLANT, FC_SLANT_ROMAN);
     FcPatternAddString(pattern.get(), FC_FONTFORMAT, reinterpret_cast<const FcChar8 *>("TrueType"));
-    const ObjectSetOwner wanted(FcObjectSetBuild(FC_FILE, FC_INDEX, FC_WEIGHT, nullptr), &FcObjectSetDestroy);
+    const ObjectSetOwner wanted(FcObjectSetBuild(FC_FILE, FC_INDEX, FC_WEIGHT, FC_CHARSET, nullptr),
+                                &FcObjectSetDestroy);
     const FontSetOwner found(FcFontList(nullptr, pattern.get(), wanted.get()), &FcFontSetDestroy);
 
     struct Found
     {
         QString file;
         int index;
+        const FcPattern *pattern;
     };
     std::optional<Found> best;
     for (int i = 0; found && i < found->nfont; ++i) {
@@ -54,36 +84,25 @@ std::optional<PdfFace> faceOfFamily(const char *family)
         // Of several files the first by name is taken, so that the choice does not hang on the order of a folder.
         const QString name = QFile::decodeName(reinterpret_cast<const char *>(file));
         if (!best || name < best->file) {
-            best = Found{name, index};
+            best = Found{name, index, found->fonts[i]};
         }
     }
     if (!best) {
         return std::nullopt;
     }
     return PdfFace(best->file, static_cast<unsigned>(best->index) & 0xFFFF,
-                   best->file.endsWith(u".ttc", Qt::CaseInsensitive));
+                   best->file.endsWith(u".ttc", Qt::CaseInsensitive), coverageOf(best->pattern));
 }
 
 } // namespace
 
-struct PdfFace::Coverage
-{
-    PatternOwner pattern{nullptr, &FcPatternDestroy};
-    FcCharSet *characters = nullptr; ///< owned by the pattern
-};
-
 PdfFace::PdfFace(QString file, unsigned index, bool isCollection)
-    : file_(std::move(file)), index_(index), isCollection_(isCollection)
-{
-    auto coverage = std::make_shared<Coverage>();
-    const QByteArray name = QFile::encodeName(file_);
-    int count = 0;
-    coverage->pattern.reset(FcFreeTypeQuery(fcText(name), index_, nullptr, &count));
-    if (coverage->pattern) {
-        FcPatternGetCharSet(coverage->pattern.get(), FC_CHARSET, 0, &coverage->characters);
-    }
-    coverage_ = std::move(coverage);
-}
+    : PdfFace(file, index, isCollection, coverageOf(file, index))
+{}
+
+PdfFace::PdfFace(QString file, unsigned index, bool isCollection, std::shared_ptr<const Coverage> coverage)
+    : file_(std::move(file)), index_(index), isCollection_(isCollection), coverage_(std::move(coverage))
+{}
 
 bool PdfFace::covers(char32_t character) const
 {

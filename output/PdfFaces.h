@@ -16,8 +16,11 @@ namespace kareport
 class KAREPORT_EXPORT PdfFace
 {
 public:
+    struct Coverage;
+
     /// Reads what a file covers. A file that is no font covers nothing and is refused when it is embedded.
     PdfFace(QString file, unsigned index, bool isCollection);
+    PdfFace(QString file, unsigned index, bool isCollection, std::shared_ptr<const Coverage> coverage);
 
     const QString &file() const { return file_; }
     unsigned index() const { return index_; } ///< of the face in a collection, from 0
@@ -26,8 +29,6 @@ public:
     bool covers(char32_t character) const;
 
 private:
-    struct Coverage;
-
     QString file_;
     unsigned index_;
     bool isCollection_;

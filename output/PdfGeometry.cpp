@@ -34,23 +34,37 @@ PdfPageBox pdfPageBox(const PdfPageSetup &setup)
     return box;
 }
 
-LinePlacement placeLines(const PdfPageSetup &setup, const PdfPageBox &box, const FaceHeight &face, qsizetype lines)
+qsizetype linesToFit(const PdfPageSetup &setup, const PdfPageBox &box, const FaceHeight &face, qsizetype linesOfReport)
 {
-    const double size = setup.fontSize;
-    const double boxHeight = std::max(smallest, double(box.top) - double(box.bottom));
-    const double lineHeight = (double(face.ascent) - double(face.descent)) / 1000 * size;
-    double leading = lineHeight;
-    if (setup.linesPerPage > 1) {
-        leading =
-            std::clamp((boxHeight - lineHeight) / (setup.linesPerPage - 1), std::min(smallest, lineHeight), lineHeight);
-    }
-    const double needed = leading * static_cast<double>(std::max<qsizetype>(lines, 1) - 1) + lineHeight;
-    const bool isBroken = lines > setup.linesPerPage;
-    const double scale = isBroken && needed > boxHeight ? boxHeight / needed : 1;
+    const qsizetype lines = setup.linesPerPage;
+    return placeLines(setup, box, face, lines, lines).leading < static_cast<float>(setup.fontSize)
+               ? std::clamp<qsizetype>(linesOfReport, 1, lines)
+               : lines;
+}
 
+LinePlacement placeLines(const PdfPageSetup &setup, const PdfPageBox &box, const FaceHeight &face, qsizetype linesToFit,
+                         qsizetype lines)
+{
+    const double boxHeight = std::max(smallest, double(box.top) - double(box.bottom));
+    const double faceHeight = (double(face.ascent) - double(face.descent)) / 1000;
+    const auto gaps = static_cast<double>(std::max<qsizetype>(linesToFit, 1) - 1);
+    double size = setup.fontSize;
+    double leading = faceHeight * size;
+    if (gaps > 0) {
+        leading = std::min(leading, (boxHeight - leading) / gaps);
+    }
+    if (leading < size) {
+        leading = size = std::min(size, boxHeight / (gaps + faceHeight));
+    }
+    if (lines > linesToFit) {
+        const double needed = leading * static_cast<double>(lines - 1) + faceHeight * size;
+        const double scale = std::min(1.0, boxHeight / needed);
+        leading *= scale;
+        size *= scale;
+    }
     LinePlacement placement;
-    placement.fontSize = static_cast<float>(scale < 1 ? std::max(smallest, size * scale) : size);
-    placement.leading = static_cast<float>(scale < 1 ? std::max(smallest, leading * scale) : leading);
+    placement.fontSize = static_cast<float>(std::max(smallest, size));
+    placement.leading = static_cast<float>(std::max(smallest, leading));
     placement.firstBaseline =
         static_cast<float>(double(box.top) - double(face.ascent) / 1000 * double(placement.fontSize));
     return placement;

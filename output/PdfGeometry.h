@@ -46,11 +46,17 @@ struct LinePlacement
 
 KAREPORT_EXPORT PdfPageBox pdfPageBox(const PdfPageSetup &setup);
 
-/// Places the lines of a page in its box: as far apart as the face is high or, where a page's lines do not fit then, as
-/// close as they have to be. A page with more lines than that, because some had to be broken, is made smaller as a whole, so
-/// that its lines stay apart.
-/// @param lines  lines that the page has after breaking
+/// The lines that a page has to have room for: those of a page or, where these would stand closer than the font is high,
+/// those of the whole report when they are fewer. A report that is not meant to have pages is given very long ones.
+KAREPORT_EXPORT qsizetype linesToFit(const PdfPageSetup &setup, const PdfPageBox &box, const FaceHeight &face,
+                                     qsizetype linesOfReport);
+
+/// Places the lines of a page in its box: as far apart as the face is high or, where the lines that a page has to have
+/// room for do not fit then, as close as they have to be. Lines never touch: the font is made smaller where it is higher
+/// than they are apart, and a page with more lines than expected, because some had to be broken, is made smaller as a whole.
+/// @param linesToFit  lines that every page has room for
+/// @param lines       lines that this page has after breaking
 KAREPORT_EXPORT LinePlacement placeLines(const PdfPageSetup &setup, const PdfPageBox &box, const FaceHeight &face,
-                                         qsizetype lines);
+                                         qsizetype linesToFit, qsizetype lines);
 
 } // namespace kareport

@@ -1,6 +1,7 @@
 #include "PdfTypesetter.h"
 
-#include <QStringEncoder>
+#include <hpdf_pages.h>
+#include <hpdf_streams.h>
 
 #include <algorithm>
 
@@ -12,8 +13,29 @@ namespace
 
 constexpr std::size_t planeSize = 0x10000;
 constexpr unsigned char unknownFace = 0xFF;
-/// The library takes a text of 65535 bytes at most.
+/// Strings of a PDF end before 65535 bytes; a character takes four at most.
 constexpr qsizetype longestRun = 16000;
+
+/// Writes a character code of two bytes into a string.
+char *writeCode(char *out, char16_t code)
+{
+    for (const int byte : {code >> 8, code & 0xFF}) {
+        switch (byte) {
+        case '(':
+        case ')':
+        case '\\':
+            *out++ = '\\';
+            *out++ = static_cast<char>(byte);
+            break;
+        case '\r': // a bare one would be read as LF
+            *out++ = '\\';
+            *out++ = 'r';
+            break;
+        default: *out++ = static_cast<char>(byte);
+        }
+    }
+    return out;
+}
 
 } // namespace
 
@@ -82,18 +104,18 @@ bool PdfTypesetter::addPage(PdfDocument &pdf, const PdfPageBox &box, const LineP
     HPDF_Page_MoveTextPos(page, box.left, placement.firstBaseline + placement.leading);
     for (const QStringView line : lines) {
         if (line.isEmpty()) {
-            HPDF_Page_MoveToNextLine(page);
+            operators_ += "T*\n";
         } else {
             showLine(page, placement.fontSize, line);
         }
     }
+    writeOut(page);
     HPDF_Page_EndText(page);
-    return pdf.isGood();
+    return pdf.isGood() && !failed_;
 }
 
 void PdfTypesetter::showLine(HPDF_Page page, float fontSize, QStringView line)
 {
-    bool onNextLine = true;
     qsizetype begin = 0;
     while (begin < line.size()) {
         const std::size_t face = faces_.size() > 1 ? faceOf(line[begin].unicode()) : 0;
@@ -103,28 +125,41 @@ void PdfTypesetter::showLine(HPDF_Page page, float fontSize, QStringView line)
             end = std::find_if(line.begin() + begin, line.begin() + end, isOther) - line.begin();
         }
         if (face != 0) {
+            writeOut(page);
             HPDF_Page_SetFontAndSize(page, faces_[face].font, fontSize);
         }
-        showRun(page, line.sliced(begin, end - begin), onNextLine);
+        addRun(line.sliced(begin, end - begin), begin == 0);
         if (face != 0) {
+            writeOut(page);
             HPDF_Page_SetFontAndSize(page, faces_.front().font, fontSize);
         }
-        onNextLine = false;
         begin = end;
     }
 }
 
-void PdfTypesetter::showRun(HPDF_Page page, QStringView run, bool onNextLine)
+void PdfTypesetter::addRun(QStringView run, bool onNextLine)
 {
-    QStringEncoder encoder(QStringEncoder::Utf8);
-    utf8_.resize(encoder.requiredSpace(run.size()) + 1);
-    char *end = encoder.appendToBuffer(utf8_.data(), run);
-    *end = '\0';
-    if (onNextLine) {
-        HPDF_Page_ShowTextNextLine(page, utf8_.constData());
-    } else {
-        HPDF_Page_ShowText(page, utf8_.constData());
+    const qsizetype size = operators_.size();
+    operators_.resize(size + 4 * run.size() + 8);
+    char *const begin = operators_.data();
+    char *out = begin + size;
+    *out++ = '(';
+    for (const QChar character : run) {
+        out = writeCode(out, character.unicode());
     }
+    operators_.truncate(out - begin);
+    operators_ += onNextLine ? ")'\n" : ")Tj\n";
+}
+
+void PdfTypesetter::writeOut(HPDF_Page page)
+{
+    // The library's own text functions write four hexadecimal digits for each character. The same codes as bytes compress
+    // in less than half the time, take half the memory, and let a page be written in one piece.
+    auto *attributes = static_cast<HPDF_PageAttr>(page->attr);
+    failed_ =
+        failed_ || HPDF_Stream_Write(attributes->stream, reinterpret_cast<const HPDF_BYTE *>(operators_.constData()),
+                                     static_cast<HPDF_UINT>(operators_.size())) != HPDF_OK;
+    operators_.resize(0);
 }
 
 } // namespace kareport

@@ -21,7 +21,8 @@ public:
 
     /// The height of the face that texts are set in, in thousandths of the font size.
     FaceHeight height() const;
-    /// The advance of a character in thousandths of the font size.
+    /// The advance of a character in thousandths of the font size. Asking for it also puts the character's glyph among
+    /// those that are embedded, so it has to be asked for every character that is shown.
     int width(char32_t character);
     /// Whether a face has the character.
     bool covers(char32_t character) const;
@@ -39,13 +40,15 @@ private:
 
     std::size_t faceOf(char16_t character);
     void showLine(HPDF_Page page, float fontSize, QStringView line);
-    void showRun(HPDF_Page page, QStringView run, bool onNextLine);
+    void addRun(QStringView run, bool onNextLine);
+    void writeOut(HPDF_Page page);
 
     std::vector<Entry> faces_;
     QString failedFace_;
     std::vector<unsigned char> faceOf_; ///< by character
     std::vector<short> widths_;         ///< by character; below 0: not asked for yet
-    QByteArray utf8_;
+    QByteArray operators_;              ///< of the page at hand, not yet written to it
+    bool failed_ = false;
 };
 
 } // namespace kareport

@@ -42,13 +42,6 @@ void RichTextBuilder::endParagraph(const RichTextParagraph &paragraph, int forma
     runs_.clear();
 }
 
-void RichTextBuilder::finish(const RichTextParagraph &paragraph)
-{
-    if (!isParagraphEmpty()) {
-        endParagraph(paragraph, -1);
-    }
-}
-
 void RichTextBuilder::startBlock(const RichTextParagraph &paragraph, int format)
 {
     const bool isFirst = blockFormat_ < 0;

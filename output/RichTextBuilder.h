@@ -14,7 +14,7 @@ class QTextDocument;
 namespace kareport
 {
 
-/// Fills a document paragraph by paragraph. Texts and paragraphs of the same formats are inserted together, as each
+/// Fills a document paragraph by paragraph; all is there when the builder goes. Texts and paragraphs of the same formats are inserted together, as each
 /// insertion has its cost.
 class RichTextBuilder
 {
@@ -39,8 +39,6 @@ public:
     /// Ends the paragraph.
     /// @param format  of the paragraph's characters where it has none
     void endParagraph(const RichTextParagraph &paragraph, int format);
-    /// Inserts what has been gathered. A paragraph that was not ended is inserted if it has text.
-    void finish(const RichTextParagraph &paragraph);
 
 private:
     struct Run

@@ -15,10 +15,10 @@ constexpr int westernCodePage = 1252;
 
 /// Bytes 0x80 to 0x9F of code page 1252; the others are Latin-1. It is what nearly every file holds, and it is read alike
 /// where no converters are at hand.
-constexpr std::array<char16_t, 32> western = {
-    0x20AC, 0x0081, 0x201A, 0x0192, 0x201E, 0x2026, 0x2020, 0x2021, 0x02C6, 0x2030, 0x0160, 0x2039, 0x0152, 0x008D,
-    0x017D, 0x008F, 0x0090, 0x2018, 0x2019, 0x201C, 0x201D, 0x2022, 0x2013, 0x2014, 0x02DC, 0x2122, 0x0161, 0x203A,
-    0x0153, 0x009D, 0x017E, 0x0178};
+constexpr std::array<char16_t, 32> western = {0x20AC, 0x0081, 0x201A, 0x0192, 0x201E, 0x2026, 0x2020, 0x2021,
+                                              0x02C6, 0x2030, 0x0160, 0x2039, 0x0152, 0x008D, 0x017D, 0x008F,
+                                              0x0090, 0x2018, 0x2019, 0x201C, 0x201D, 0x2022, 0x2013, 0x2014,
+                                              0x02DC, 0x2122, 0x0161, 0x203A, 0x0153, 0x009D, 0x017E, 0x0178};
 
 struct NumberRow
 {
@@ -26,22 +26,28 @@ struct NumberRow
     const char *name;
 };
 
-constexpr NumberRow pageNames[] = {
-    {437, "IBM437"},          {720, "IBM720"},           {737, "IBM737"},
-    {775, "IBM775"},          {850, "IBM850"},           {852, "IBM852"},
-    {855, "IBM855"},          {857, "IBM857"},           {858, "IBM858"},
-    {860, "IBM860"},          {861, "IBM861"},           {862, "IBM862"},
-    {863, "IBM863"},          {864, "IBM864"},           {865, "IBM865"},
-    {866, "IBM866"},          {869, "IBM869"},           {874, "windows-874"},
-    {932, "windows-31j"},     {936, "windows-936"},      {949, "windows-949"},
-    {950, "windows-950"},     {1250, "windows-1250"},    {1251, "windows-1251"},
-    {1253, "windows-1253"},   {1254, "windows-1254"},    {1255, "windows-1255"},
-    {1256, "windows-1256"},   {1257, "windows-1257"},    {1258, "windows-1258"},
-    {10000, "macintosh"},     {10001, "windows-31j"},    {10002, "windows-950"},
-    {10003, "windows-949"},   {10006, "x-mac-greek"},    {10007, "x-mac-cyrillic"},
-    {10008, "windows-936"},   {10029, "x-mac-centraleurroman"}, {10081, "x-mac-turkish"},
-    {20866, "KOI8-R"},        {21866, "KOI8-U"},         {54936, "GB18030"},
-    {65001, "UTF-8"}};
+constexpr NumberRow pageNames[] = {{437, "IBM437"},          {720, "IBM720"},
+                                   {737, "IBM737"},          {775, "IBM775"},
+                                   {850, "IBM850"},          {852, "IBM852"},
+                                   {855, "IBM855"},          {857, "IBM857"},
+                                   {858, "IBM858"},          {860, "IBM860"},
+                                   {861, "IBM861"},          {862, "IBM862"},
+                                   {863, "IBM863"},          {864, "IBM864"},
+                                   {865, "IBM865"},          {866, "IBM866"},
+                                   {869, "IBM869"},          {874, "windows-874"},
+                                   {932, "windows-31j"},     {936, "windows-936"},
+                                   {949, "windows-949"},     {950, "windows-950"},
+                                   {1250, "windows-1250"},   {1251, "windows-1251"},
+                                   {1253, "windows-1253"},   {1254, "windows-1254"},
+                                   {1255, "windows-1255"},   {1256, "windows-1256"},
+                                   {1257, "windows-1257"},   {1258, "windows-1258"},
+                                   {10000, "macintosh"},     {10001, "windows-31j"},
+                                   {10002, "windows-950"},   {10003, "windows-949"},
+                                   {10006, "x-mac-greek"},   {10007, "x-mac-cyrillic"},
+                                   {10008, "windows-936"},   {10029, "x-mac-centraleurroman"},
+                                   {10081, "x-mac-turkish"}, {20866, "KOI8-R"},
+                                   {21866, "KOI8-U"},        {54936, "GB18030"},
+                                   {65001, "UTF-8"}};
 
 struct CharsetRow
 {
@@ -49,11 +55,11 @@ struct CharsetRow
     int codePage;
 };
 
-constexpr CharsetRow charsets[] = {
-    {0, 1252},    {2, symbolCodePage}, {77, 10000}, {78, 10001}, {79, 10003}, {80, 10008},  {81, 10002}, {83, 10006},
-    {85, 10081},  {88, 10029},         {89, 10007}, {128, 932},  {129, 949},  {134, 936},   {136, 950},  {161, 1253},
-    {162, 1254},  {163, 1258},         {177, 1255}, {178, 1256}, {186, 1257}, {204, 1251},  {222, 874},  {238, 1250},
-    {254, 437},   {255, 850}};
+constexpr CharsetRow charsets[] = {{0, 1252},   {2, symbolCodePage}, {77, 10000}, {78, 10001}, {79, 10003}, {80, 10008},
+                                   {81, 10002}, {83, 10006},         {85, 10081}, {88, 10029}, {89, 10007}, {128, 932},
+                                   {129, 949},  {134, 936},          {136, 950},  {161, 1253}, {162, 1254}, {163, 1258},
+                                   {177, 1255}, {178, 1256},         {186, 1257}, {204, 1251}, {222, 874},  {238, 1250},
+                                   {254, 437},  {255, 850}};
 
 constexpr bool isMultiByte(int number)
 {
@@ -109,9 +115,9 @@ QString RichTextCodePage::decode(QByteArrayView bytes)
 RichTextCodePage &RichTextCodePages::page(int number)
 {
     // Numbers that nobody knows share one page, however many a file makes up.
-    const bool known = number == symbolCodePage ||
-                       std::any_of(std::begin(pageNames), std::end(pageNames),
-                                   [number](const NumberRow &row) { return row.number == number; });
+    const bool known =
+        number == symbolCodePage || std::any_of(std::begin(pageNames), std::end(pageNames),
+                                                [number](const NumberRow &row) { return row.number == number; });
     auto &page = pages_[known ? number : westernCodePage];
     if (!page) {
         page = std::make_unique<RichTextCodePage>(known ? number : westernCodePage);

@@ -11,6 +11,7 @@
 
 #include <QByteArray>
 
+#include <cstddef>
 #include <string_view>
 #include <vector>
 
@@ -72,6 +73,11 @@ private:
     void endRow(bool isNested);
     void breakPage();
 
+    std::size_t openGroups() const
+    {
+        // The group that is passed over is among the open ones as well.
+        return outer_.size() + static_cast<std::size_t>(skipDepth_ > 0 ? skipDepth_ - 1 : 0);
+    }
     bool isShown() const
     {
         return state_.destination == RichTextDestination::Body && (state_.characters.flags & HiddenFlag) == 0;

@@ -11,8 +11,8 @@ namespace
 
 constexpr auto endsText = [] {
     std::array<bool, 256> ends{};
-    for (const unsigned char byte : {'\\', '{', '}', '\r', '\n', '\0'}) {
-        ends[byte] = true;
+    for (const char byte : {'\\', '{', '}', '\r', '\n', '\0'}) {
+        ends[static_cast<unsigned char>(byte)] = true;
     }
     return ends;
 }();

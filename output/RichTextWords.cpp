@@ -5,6 +5,8 @@
 #include <QFont>
 
 #include <algorithm>
+#include <array>
+#include <cstddef>
 #include <iterator>
 
 namespace kareport
@@ -204,12 +206,28 @@ constexpr RichTextWord words[] = {
 constexpr auto comesBefore = [](const RichTextWord &left, const RichTextWord &right) { return left.name < right.name; };
 static_assert(std::is_sorted(std::begin(words), std::end(words), comesBefore));
 
+/// Where the words of each letter begin, and where those of the last one end.
+constexpr auto letterStarts = [] {
+    std::array<std::size_t, 27> starts{};
+    for (std::size_t letter = 0; letter < starts.size(); ++letter) {
+        while (starts[letter] < std::size(words) && words[starts[letter]].name[0] - 'a' < static_cast<int>(letter)) {
+            ++starts[letter];
+        }
+    }
+    return starts;
+}();
+
 } // namespace
 
 const RichTextWord *findRichTextWord(std::string_view name)
 {
-    const auto *word = std::lower_bound(std::begin(words), std::end(words), RichTextWord{name, Skip}, comesBefore);
-    return word != std::end(words) && word->name == name ? word : nullptr;
+    if (name.empty() || name[0] < 'a' || name[0] > 'z') {
+        return nullptr;
+    }
+    const auto letter = static_cast<std::size_t>(name[0] - 'a');
+    const auto *end = words + letterStarts[letter + 1];
+    const auto *word = std::lower_bound(words + letterStarts[letter], end, RichTextWord{name, Skip}, comesBefore);
+    return word != end && word->name == name ? word : nullptr;
 }
 
 } // namespace kareport

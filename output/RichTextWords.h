@@ -58,7 +58,7 @@ enum class RichTextAction
     Picture,
     Object,
     ObjectResult,
-    TwoForms,   ///< one form of a text for old readers, and behind it one in Unicode
+    TwoForms, ///< one form of a text for old readers, and behind it one in Unicode
     UnicodeForm
 };
 

@@ -22,4 +22,23 @@ QString pageHeaderLine(const QString &application, const QString &title, const Q
     return front + u' ' + placed + u' ' + pageLabel;
 }
 
+std::optional<int> linesBetweenPageHeaders(QStringView text, QStringView pageLabel)
+{
+    const auto isHeader = [pageLabel](QStringView line, int page) {
+        const qsizetype label = line.lastIndexOf(pageLabel);
+        return label > 0 && line.sliced(label + pageLabel.size()).trimmed() == QString::number(page);
+    };
+    int number = 0;
+    for (const QStringView line : text.tokenize(u'\n')) {
+        if (number == 0 && !isHeader(line, 1)) {
+            return std::nullopt;
+        }
+        if (number > 0 && isHeader(line, 2)) {
+            return number;
+        }
+        ++number;
+    }
+    return std::nullopt;
+}
+
 } // namespace kareport

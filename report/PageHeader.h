@@ -4,6 +4,9 @@
 
 #include <QDateTime>
 #include <QString>
+#include <QStringView>
+
+#include <optional>
 
 namespace kareport
 {
@@ -16,5 +19,9 @@ KAREPORT_EXPORT QString pageHeaderLine(const QString &application, const QString
 
 /// A date and time such as "Mar 05, 2024  02:07PM", in English on every machine.
 KAREPORT_EXPORT QString pageHeaderDate(const QDateTime &time);
+
+/// The lines of a page of a report, as its first two header lines tell: the number of lines from the one to the other.
+/// Nothing when the text does not begin with the header of page 1 or has no second page.
+KAREPORT_EXPORT std::optional<int> linesBetweenPageHeaders(QStringView text, QStringView pageLabel);
 
 } // namespace kareport

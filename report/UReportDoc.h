@@ -17,6 +17,7 @@
 #include <QSize>
 #include <QString>
 
+#include <functional>
 #include <memory>
 #include <optional>
 
@@ -59,8 +60,10 @@ public:
     /// Writes the text to an open device, in UTF-8. @return false as soon as a write fails
     bool WriteText(QIODevice &device, kareport::LineEnds lineEnds) const;
     /// Writes the text to an open device as a PDF. @param notes  receives what is missing or went wrong; may be null
-    /// @return false when there is no measured page or no font, or a write fails
-    bool WritePdf(QIODevice &device, kareport::PdfNotes *notes = nullptr) const;
+    /// @param progress  is told the pages done and all pages; its false stops the work. May be empty
+    /// @return false when there is no measured page or no font, a write fails, or the work was stopped
+    bool WritePdf(QIODevice &device, kareport::PdfNotes *notes = nullptr,
+                  const std::function<bool(qint64, qint64)> &progress = {}) const;
     /// Replaces the text as it is. Counters stay, so what is written next continues the old pages.
     void SetData(const QString &text);
     /// Empties the report. The next line written begins page 1.

@@ -151,11 +151,13 @@ bool UReportDoc::WriteText(QIODevice &device, kareport::LineEnds lineEnds) const
                            : kareport::writeReportText(device, text.view(), lineEnds);
 }
 
-bool UReportDoc::WritePdf(QIODevice &device, kareport::PdfNotes *notes) const
+bool UReportDoc::WritePdf(QIODevice &device, kareport::PdfNotes *notes,
+                          const std::function<bool(qint64, qint64)> &progress) const
 {
     kareport::PdfOptions options;
     options.page = {geometry_.pageSize, geometry_.resolution, margins_, fontSize_, GetLinesPerPage()};
     options.lineCount = GetLineCount();
+    options.progress = progress;
     const kareport::ReportText &text = page_.text();
     return text.isNarrow() ? kareport::writePdf(device, text.narrowView(), options, notes)
                            : kareport::writePdf(device, text.view(), options, notes);

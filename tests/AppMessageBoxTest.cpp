@@ -42,4 +42,34 @@ TEST(AppMessageBox, TheHandlerGetsTextAndButtonsAndAnswers)
                                   MessageButtons::YesNoCancel}));
 }
 
+TEST(AppMessageBox, ShowsAStandardTextByItsNumber)
+{
+    struct Row
+    {
+        unsigned number;
+        QStringView expected;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {61701, u"The file is too large to open.", "of a document that is opened"},
+        {61442, u"All Files (*.*)", "a title can be shown, too"},
+        {0, u"", "no text has this number"},
+        {0xFFFFFFFF, u"", "no text has this number"},
+    };
+    for (const Row &row : rows) {
+        EXPECT_EQ(AppMessageBox(row.number, 0, 0xFFFFFFFF), MessageAnswer::Cancel) << "nothing is installed";
+        QStringList texts;
+        std::vector<MessageButtons> asked;
+        kareport::setMessageHandler([&](const QString &text, MessageButtons buttons) {
+            texts.append(text);
+            asked.push_back(buttons);
+            return MessageAnswer::Ok;
+        });
+        EXPECT_EQ(AppMessageBox(row.number, 0, 0xFFFFFFFF), MessageAnswer::Ok) << row.reason;
+        kareport::setMessageHandler({});
+        EXPECT_EQ(texts, QStringList{row.expected.toString()}) << row.reason;
+        EXPECT_EQ(asked, std::vector{MessageButtons::Ok}) << row.reason;
+    }
+}
+
 } // namespace

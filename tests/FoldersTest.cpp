@@ -1,6 +1,7 @@
 #include "Folders.h"
 
 #include "PrintQt.h"
+#include "Profile.h"
 
 #include <QDir>
 #include <QFile>
@@ -82,6 +83,74 @@ TEST(Folders, TemporaryFilesCanBeMadeInTheSystemsFolder)
 {
     EXPECT_TRUE(QFileInfo(GetTempDir(false)).isDir());
     EXPECT_EQ(QDir(GetTempDir(false)), QDir::temp());
+}
+
+class LastOpenFolder : public testing::Test
+{
+protected:
+    void SetUp() override { kareport::setProfileStore(kareport::makeMemoryProfile()); }
+    void TearDown() override { kareport::setProfileStore(kareport::makeMemoryProfile()); }
+};
+
+TEST_F(LastOpenFolder, IsTheFolderOfTheFileUnderItsKey)
+{
+    const QTemporaryDir folder;
+    const QTemporaryDir otherFolder;
+    const QString reports = QStringLiteral("LastOpenDirectoryReport");
+    const QString plans = QStringLiteral("LastOpenDirectoryPlan");
+    EXPECT_EQ(GetInitialOpenDir(reports), QString()) << "nothing has been opened";
+    SetLastOpenDir(folder.filePath(QStringLiteral("a.rep")), reports);
+    EXPECT_EQ(GetInitialOpenDir(reports), folder.path()) << "the file itself need not exist";
+    EXPECT_EQ(GetInitialOpenDir(plans), QString()) << "each purpose for itself";
+    SetLastOpenDir(otherFolder.filePath(QStringLiteral("b.rep")), plans);
+    EXPECT_EQ(GetInitialOpenDir(reports), folder.path());
+    SetLastOpenDir(otherFolder.filePath(QStringLiteral("c.rep")), reports);
+    EXPECT_EQ(GetInitialOpenDir(reports), otherFolder.path()) << "the last one counts";
+    EXPECT_EQ(GetProfileString(QString(), reports), otherFolder.path()) << "kept with the preferences";
+}
+
+TEST_F(LastOpenFolder, IsKeptAsAFullPath)
+{
+    const FoldersRestored restored;
+    const QTemporaryDir folder;
+    ASSERT_TRUE(QDir::setCurrent(folder.path()));
+    const QString here = QDir::currentPath();
+    const QString key = QStringLiteral("LastOpenDirectoryReport");
+    struct Row
+    {
+        QString path;
+        QString expected;
+        const char *reason;
+    };
+    const Row rows[] = {
+        {QStringLiteral("a.rep"), here, "a name alone stands in the current folder"},
+        {QStringLiteral("測量 é.rep"), here, "characters beyond ASCII"},
+        {QStringLiteral("/a.rep"), QStringLiteral("/"), "the root"},
+        {QDir::tempPath() + QStringLiteral("/a"), QDir::tempPath(), "a file without an extension"},
+    };
+    for (const Row &row : rows) {
+        SetLastOpenDir(row.path, key);
+        ASSERT_TRUE(QDir::setCurrent(QStringLiteral("/")));
+        EXPECT_EQ(GetInitialOpenDir(key), row.expected) << row.reason;
+        ASSERT_TRUE(QDir::setCurrent(folder.path()));
+    }
+}
+
+TEST_F(LastOpenFolder, ThatIsGoneIsNotOffered)
+{
+    const QString key = QStringLiteral("LastOpenDirectoryReport");
+    QTemporaryDir folder;
+    const QString path = folder.path();
+    SetLastOpenDir(folder.filePath(QStringLiteral("a.rep")), key);
+    ASSERT_TRUE(folder.remove());
+    EXPECT_EQ(GetInitialOpenDir(key), QString());
+    ASSERT_TRUE(QDir().mkpath(path));
+    EXPECT_EQ(GetInitialOpenDir(key), path) << "offered again when it is back";
+    ASSERT_TRUE(QDir().rmdir(path));
+    QFile file(path);
+    ASSERT_TRUE(file.open(QIODevice::WriteOnly));
+    EXPECT_EQ(GetInitialOpenDir(key), QString()) << "a file of its name is no folder";
+    ASSERT_TRUE(file.remove());
 }
 
 } // namespace

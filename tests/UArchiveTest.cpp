@@ -1,5 +1,6 @@
 #include "UArchive.h"
 
+#include "LimitedDevice.h"
 #include "PrintQt.h"
 
 #include <QBuffer>
@@ -38,27 +39,6 @@ TEST(UArchive, LoadsFromAFileOfALength)
     EXPECT_TRUE(archive.IsGood());
 }
 
-/// A device that takes at most so many bytes at a write; -1 lets it fail.
-class LimitedDevice : public QIODevice
-{
-public:
-    LimitedDevice() { open(QIODevice::WriteOnly | QIODevice::Unbuffered); }
-
-    qint64 limit = 100;
-    QByteArray taken;
-
-protected:
-    qint64 readData(char *, qint64) override { return -1; }
-    qint64 writeData(const char *data, qint64 size) override
-    {
-        const qint64 written = qMin(size, limit);
-        if (written > 0) {
-            taken.append(data, written);
-        }
-        return written;
-    }
-};
-
 TEST(UArchive, AFailedWriteIsRemembered)
 {
     struct Row
@@ -85,6 +65,33 @@ TEST(UArchive, AFailedWriteIsRemembered)
         EXPECT_FALSE(archive.IsGood()) << row.reason << ": for good";
         EXPECT_EQ(device.taken, row.taken.toByteArray()) << row.reason << ": nothing is written behind the gap";
     }
+}
+
+TEST(UArchive, ThatWasGivenUpWritesNothingMore)
+{
+    QBuffer buffer;
+    ASSERT_TRUE(buffer.open(QIODevice::WriteOnly));
+    UArchive archive(buffer, UArchive::Mode::Storing, QString());
+    archive.Write("before");
+    archive.Abandon();
+    EXPECT_FALSE(archive.IsGood());
+    archive.Write("behind");
+    archive.Abandon();
+    EXPECT_FALSE(archive.IsGood()) << "for good";
+    EXPECT_EQ(buffer.data(), QByteArray("before"));
+}
+
+TEST(UArchive, AFileThatIsGivenUpWhileItIsLoadedKeepsItsLength)
+{
+    QBuffer buffer;
+    buffer.setData("content");
+    ASSERT_TRUE(buffer.open(QIODevice::ReadOnly));
+    UArchive archive(buffer, UArchive::Mode::Loading, QStringLiteral("/jobs/a.rep"));
+    archive.Abandon();
+    EXPECT_FALSE(archive.IsGood());
+    EXPECT_TRUE(archive.IsLoading());
+    EXPECT_EQ(archive.GetLength(), 7);
+    EXPECT_EQ(archive.GetFilePath(), QStringLiteral("/jobs/a.rep"));
 }
 
 } // namespace

@@ -246,6 +246,19 @@ TEST(UDocument, ItsPanesCanBeClosedWithoutIt)
     EXPECT_TRUE(document->IsAutoDelete()) << "on again";
 }
 
+TEST(UDocument, HasNoObjectsThatTextCanBeWrittenForUnlessItSaysSo)
+{
+    FrameLog log;
+    TextDocument document(log);
+    document.content = "content";
+    for (const unsigned id : {0U, 1U, 0xFFFFFFFFU}) {
+        EXPECT_FALSE(document.OnTextReceived(id, QStringLiteral("text"))) << id;
+    }
+    EXPECT_EQ(document.content, "content");
+    EXPECT_FALSE(document.IsModified());
+    EXPECT_EQ(log.events, QStringList());
+}
+
 TEST(UDocument, ThatGoesLeavesItsViewsWithoutADocument)
 {
     FrameLog log;

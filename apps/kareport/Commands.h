@@ -39,6 +39,20 @@ struct RenderCommand
     ExitStatus run(int &argc, char **argv) const;
 };
 
+/// `kareport convert`
+struct ConvertCommand
+{
+    QString input;
+    QString output;
+    QString as;
+    QStringList sets; ///< keys of the page
+    bool progress = false;
+    bool quiet = false;
+
+    std::optional<QString> usageError() const;
+    ExitStatus run(int &argc, char **argv) const;
+};
+
 /// `kareport templates`
 struct TemplatesCommand
 {

@@ -19,8 +19,6 @@ enum ByteClass : unsigned char
     special ///< ends a cell or stands nowhere in a plain one
 };
 
-/// What is read into memory from a pipe or a device, which may never end.
-constexpr qint64 largestUnmapped = qint64(1) << 30;
 constexpr std::string_view byteOrderMark = "\xEF\xBB\xBF";
 
 bool isUtf8(std::string_view text)
@@ -29,31 +27,6 @@ bool isUtf8(std::string_view text)
 }
 
 } // namespace
-
-Expected<std::shared_ptr<const FileBytes>> FileBytes::open(const QString &path)
-{
-    auto bytes = std::make_shared<FileBytes>();
-    bytes->path_ = path;
-    bytes->file_.setFileName(path);
-    if (!bytes->file_.open(QIODevice::ReadOnly)) {
-        return InputError{path, std::nullopt, bytes->file_.errorString()};
-    }
-    const qint64 size = bytes->file_.size();
-    if (const uchar *mapped = size > 0 ? bytes->file_.map(0, size) : nullptr) {
-        bytes->view_ = {reinterpret_cast<const char *>(mapped), static_cast<std::size_t>(size)};
-        return std::shared_ptr<const FileBytes>(std::move(bytes));
-    }
-    bytes->content_ = bytes->file_.read(largestUnmapped + 1);
-    if (bytes->content_.size() > largestUnmapped) {
-        return InputError{path, TextPlace(),
-                          Xlate("more than %1 MB come out of what is no file").arg(largestUnmapped >> 20)};
-    }
-    if (bytes->file_.error() != QFileDevice::NoError) {
-        return InputError{path, std::nullopt, bytes->file_.errorString()};
-    }
-    bytes->view_ = {bytes->content_.constData(), static_cast<std::size_t>(bytes->content_.size())};
-    return std::shared_ptr<const FileBytes>(std::move(bytes));
-}
 
 CsvReader::CsvReader(const QString &path, std::string_view bytes, char delimiter)
     : path_(path), bytes_(bytes), delimiter_(delimiter)

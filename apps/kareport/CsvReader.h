@@ -1,35 +1,18 @@
 #pragma once
 
+#include "FileBytes.h"
 #include "InputError.h"
 
-#include <QFile>
 #include <QString>
 
 #include <array>
 #include <cstddef>
-#include <memory>
 #include <string>
 #include <string_view>
 #include <vector>
 
 namespace kareport
 {
-
-/// The bytes of a file, mapped where the system can, so that a large file is never in memory as a whole.
-class FileBytes
-{
-public:
-    static Expected<std::shared_ptr<const FileBytes>> open(const QString &path);
-
-    std::string_view view() const { return view_; }
-    const QString &path() const { return path_; }
-
-private:
-    QString path_;
-    QFile file_;
-    QByteArray content_; ///< of a file that cannot be mapped
-    std::string_view view_;
-};
 
 /// Reads a CSV text (RFC 4180, UTF-8 with or without a byte-order mark) row by row, in one pass.
 class CsvReader

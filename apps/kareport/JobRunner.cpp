@@ -17,6 +17,8 @@
 #include <QDir>
 #include <QFileInfo>
 
+#include <algorithm>
+
 namespace kareport
 {
 
@@ -246,6 +248,8 @@ std::optional<InputError> JobRunner::prepare()
     if (report_ == nullptr) {
         return InputError{source_.path(), std::nullopt, Xlate("the report could not be made")};
     }
+    report_->SetRTFDataFlag(std::any_of(job_.outputs.begin(), job_.outputs.end(),
+                                        [](const Output &output) { return output.kind == OutputKind::RichTextImage; }));
     DefaultPrinter printer = job_.page.printer;
     if (!needsFonts(job_)) {
         printer.source = PrinterSource::BuiltIn; // the page is fixed: no printer is asked

@@ -14,8 +14,9 @@ struct KindRow
 };
 
 constexpr KindRow kinds[] = {
-    {OutputKind::Report, u"rep", u".rep"},
-    {OutputKind::Text, u"text", u".txt"},
+    {OutputKind::Report, u"rep", u".rep"},         {OutputKind::Text, u"text", u".txt"},
+    {OutputKind::RichText, u"rtf", u".rtf"},       {OutputKind::Pdf, u"pdf", u".pdf"},
+    {OutputKind::RichTextImage, u"rtf-image", {}}, // a ".rtf" file, which its name alone does not tell
 };
 
 } // namespace
@@ -36,8 +37,10 @@ std::optional<OutputKind> outputKindOf(const QString &file, std::optional<Output
         return otherwise.value_or(OutputKind::Text);
     }
     for (const KindRow &row : kinds) {
-        if (file.endsWith(row.ending, Qt::CaseInsensitive)) {
-            return row.kind;
+        if (!row.ending.isEmpty() && file.endsWith(row.ending, Qt::CaseInsensitive)) {
+            // Both kinds of rich text have one ending.
+            const bool isImage = row.kind == OutputKind::RichText && otherwise == OutputKind::RichTextImage;
+            return isImage ? *otherwise : row.kind;
         }
     }
     return otherwise;

@@ -10,14 +10,17 @@ namespace kareport
 /// What a report is written as.
 enum class OutputKind
 {
-    Report, ///< a report file
-    Text    ///< plain text, UTF-8
+    Report,   ///< a report file
+    Text,     ///< plain text, UTF-8
+    RichText, ///< rich text as the report's view saves it
+    Pdf,
+    RichTextImage ///< the rich text that is handed to a word processor
 };
 
 /// The kind of a name such as "rep".
 std::optional<OutputKind> outputKindFromName(const QString &name);
 /// The kind that a file name's ending says, or `otherwise` where it says none. Standard output, "-", says none, and is
-/// text without an `otherwise`.
+/// text without an `otherwise`. ".rtf" says rich text of either kind: the image is taken where `otherwise` is it.
 std::optional<OutputKind> outputKindOf(const QString &file, std::optional<OutputKind> otherwise = std::nullopt);
 /// The names of all kinds, for messages.
 QString outputKindNames();

@@ -1,9 +1,14 @@
 #include "OutputWriter.h"
 
+#include "Interrupt.h"
+#include "PdfExport.h"
 #include "ReplaceFile.h"
+#include "ReportContent.h"
+#include "RichTextWriter.h"
 #include "Xlate.h"
 
 #include <QFile>
+#include <QTextDocument>
 
 #include <cstdio>
 
@@ -13,31 +18,92 @@ namespace kareport
 namespace
 {
 
-LineEnds lineEndsOf(OutputKind kind)
+/// Writes one report to one output.
+class OutputWriting
 {
-    return kind == OutputKind::Report ? LineEnds::ReportFile : LineEnds::PlainText;
-}
+public:
+    OutputWriting(UReportDoc &report, const Output &output, Progress &progress, QStringList &warnings)
+        : report_(report), output_(output), progress_(progress), warnings_(warnings)
+    {}
+
+    std::optional<QString> write()
+    {
+        if (output_.isStandardOutput()) {
+            QFile file;
+            const bool done = file.open(stdout, QIODevice::WriteOnly) && writeTo(file) && file.flush();
+            return done ? std::nullopt
+                        : std::optional(
+                              Xlate("the report could not be written to standard output: %1").arg(reason(file)));
+        }
+        if (output_.kind == OutputKind::Report && report_.IsEmpty()) {
+            // Saving an empty report makes no file.
+            return std::nullopt;
+        }
+        QString error;
+        const bool done = replaceFile(
+            output_.file, [this](QIODevice &device) { return writeTo(device); }, &error);
+        return done ? std::nullopt
+                    : std::optional(Xlate("\"%1\" could not be written: %2")
+                                        .arg(output_.file, problem_.isEmpty() ? error : problem_));
+    }
+
+private:
+    QString reason(const QFile &file) const { return problem_.isEmpty() ? file.errorString() : problem_; }
+
+    bool writeTo(QIODevice &device)
+    {
+        switch (output_.kind) {
+        case OutputKind::Report: return report_.WriteText(device, LineEnds::ReportFile);
+        case OutputKind::Text: return report_.WriteText(device, LineEnds::PlainText);
+        case OutputKind::RichText: return writeRichTextTo(device);
+        case OutputKind::Pdf: return writePdfTo(device);
+        case OutputKind::RichTextImage: return report_.WriteRichTextFile(device);
+        }
+        return false;
+    }
+
+    bool writeRichTextTo(QIODevice &device)
+    {
+        // What this writes must not hang on another output that wants the report in rich-text mode.
+        const bool isImageOn = report_.GetRTFDataFlag();
+        report_.SetRTFDataFlag(false);
+        QTextDocument document;
+        RichTextNotes notes;
+        const auto error = showReportContent(report_, document, &notes);
+        report_.SetRTFDataFlag(isImageOn);
+        if (error) {
+            problem_ = Xlate("the report begins as rich text, but %1 (line %2, column %3)")
+                           .arg(error->text, QString::number(error->place.line), QString::number(error->place.column));
+            return false;
+        }
+        warnings_ += notes.texts();
+        return writeRichText(device, document);
+    }
+
+    bool writePdfTo(QIODevice &device)
+    {
+        PdfNotes notes;
+        const bool done = report_.WritePdf(device, &notes, [this](qint64 page, qint64 pages) {
+            progress_.advance(static_cast<std::size_t>(page), static_cast<std::size_t>(pages));
+            return !isInterrupted();
+        });
+        problem_ = notes.problem;
+        warnings_ += notes.warnings();
+        return done;
+    }
+
+    UReportDoc &report_;
+    const Output &output_;
+    Progress &progress_;
+    QStringList &warnings_;
+    QString problem_;
+};
 
 } // namespace
 
-std::optional<QString> writeOutput(UReportDoc &report, const Output &output)
+std::optional<QString> writeOutput(UReportDoc &report, const Output &output, Progress &progress, QStringList &warnings)
 {
-    const LineEnds lineEnds = lineEndsOf(output.kind);
-    if (output.isStandardOutput()) {
-        QFile file;
-        const bool done = file.open(stdout, QIODevice::WriteOnly) && report.WriteText(file, lineEnds) && file.flush();
-        return done ? std::nullopt
-                    : std::optional(
-                          Xlate("the report could not be written to standard output: %1").arg(file.errorString()));
-    }
-    if (output.kind == OutputKind::Report && report.IsEmpty()) {
-        // Saving an empty report makes no file.
-        return std::nullopt;
-    }
-    QString error;
-    const bool done = replaceFile(
-        output.file, [&](QIODevice &device) { return report.WriteText(device, lineEnds); }, &error);
-    return done ? std::nullopt : std::optional(Xlate("\"%1\" could not be written: %2").arg(output.file, error));
+    return OutputWriting(report, output, progress, warnings).write();
 }
 
 } // namespace kareport

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "OutputKind.h"
+#include "Progress.h"
 #include "UReportDoc.h"
 
 #include <optional>
@@ -8,7 +9,8 @@
 namespace kareport
 {
 
-/// Writes a report to where an output says. @return what went wrong; nothing when it was written
-std::optional<QString> writeOutput(UReportDoc &report, const Output &output);
+/// Writes a report to where an output says. @param warnings  receives what a reader of the output should know
+/// @return what went wrong; nothing when it was written
+std::optional<QString> writeOutput(UReportDoc &report, const Output &output, Progress &progress, QStringList &warnings);
 
 } // namespace kareport

@@ -27,6 +27,12 @@ void Progress::advance(std::size_t done)
     }
 }
 
+void Progress::advance(std::size_t done, std::size_t total)
+{
+    total_ = total;
+    advance(done);
+}
+
 void Progress::show(std::size_t done)
 {
     sinceShown_.start();

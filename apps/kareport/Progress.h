@@ -21,6 +21,8 @@ public:
     void begin(const QString &what, std::size_t total);
     /// Shows how much is done, a few times a second at most.
     void advance(std::size_t done);
+    /// The same for work whose amount shows only on the way.
+    void advance(std::size_t done, std::size_t total);
     /// Takes the line off the screen.
     void finish();
 

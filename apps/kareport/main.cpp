@@ -1,4 +1,5 @@
 #include "Commands.h"
+#include "OutputKind.h"
 
 #include <CLI/CLI.hpp>
 
@@ -24,6 +25,11 @@ QStringList texts(const std::vector<std::string> &values)
 QString text(const std::string &value)
 {
     return QString::fromLocal8Bit(value.data(), static_cast<qsizetype>(value.size()));
+}
+
+std::string kindNames()
+{
+    return kareport::outputKindNames().toStdString();
 }
 
 /// What the options of `kareport render` are read into.
@@ -67,7 +73,7 @@ CLI::App *addRender(CLI::App &program, RenderOptions &options)
                      "Output file instead of the job's; - for standard output. May stand several times")
         ->type_name("FILE")
         ->allow_extra_args(false);
-    render->add_option("--as", options.as, "Kind of the outputs where their names do not say it: rep, text")
+    render->add_option("--as", options.as, "Kind of the outputs where their names do not say it: " + kindNames())
         ->type_name("KIND");
     render
         ->add_option("--set", options.sets, "Set a key of the job, as settings.lengthUnit=ft. May stand several times")
@@ -84,6 +90,57 @@ CLI::App *addRender(CLI::App &program, RenderOptions &options)
     return render;
 }
 
+/// What the options of `kareport convert` are read into.
+struct ConvertOptions
+{
+    std::string input;
+    std::string output;
+    std::string as;
+    std::vector<std::string> sets;
+    bool progress = false;
+    bool quiet = false;
+
+    kareport::ConvertCommand command() const
+    {
+        return {text(input), text(output), text(as), texts(sets), progress, quiet};
+    }
+};
+
+CLI::App *addConvert(CLI::App &program, ConvertOptions &options)
+{
+    CLI::App *convert =
+        program.add_subcommand("convert", "Turn a saved report into another kind, by the names' endings");
+    convert->add_option("IN", options.input, "Saved report: a report file, rich text, or plain text in UTF-8")
+        ->required();
+    convert->add_option("OUT", options.output, "Output file; - for standard output")->required();
+    convert->add_option("--as", options.as, "Kind of the output where its name does not say it: " + kindNames())
+        ->type_name("KIND");
+    convert
+        ->add_option("--set", options.sets, "Set a key of the page, as page.linesPerPage=60. May stand several times")
+        ->type_name("KEY=VALUE")
+        ->allow_extra_args(false);
+    convert->add_flag("--progress", options.progress, "Show how far the work has come");
+    convert->add_flag("--quiet", options.quiet, "Say nothing but errors");
+    convert->footer("The pages of a PDF are those of the report: its header lines tell how many lines a page has. A\n"
+                    "report without header lines is cut into pages as measured, or as page.linesPerPage says.\n"
+                    "Examples:\n"
+                    "  kareport convert stakeout.rep stakeout.pdf\n"
+                    "  kareport convert stakeout.rep stakeout.pdf --set page.paper=Letter --set page.linesPerPage=60");
+    return convert;
+}
+
+/// Runs a command that makes reports.
+template <typename Command>
+int runReportCommand(const Command &command, const char *name, int argc, char **argv)
+{
+    if (const auto wrong = command.usageError()) {
+        kareport::printError(QStringLiteral("kareport: ") + *wrong);
+        kareport::printError(QStringLiteral("kareport %1 --help tells more.").arg(QLatin1StringView(name)));
+        return exitUsage;
+    }
+    return command.run(argc, argv);
+}
+
 int runProgram(int argc, char **argv)
 {
     CLI::App program("Fixed-pitch reports for civil engineering and surveying");
@@ -96,6 +153,9 @@ int runProgram(int argc, char **argv)
 
     RenderOptions render;
     CLI::App *renderCommand = addRender(program, render);
+
+    ConvertOptions convert;
+    CLI::App *convertCommand = addConvert(program, convert);
 
     std::string templatesFile;
     std::string templatesName;
@@ -121,13 +181,10 @@ int runProgram(int argc, char **argv)
     }
 
     if (renderCommand->parsed()) {
-        const kareport::RenderCommand command = render.command();
-        if (const auto wrong = command.usageError()) {
-            kareport::printError(QStringLiteral("kareport: ") + *wrong);
-            kareport::printError(QStringLiteral("kareport render --help tells more."));
-            return exitUsage;
-        }
-        return command.run(argc, argv);
+        return runReportCommand(render.command(), "render", argc, argv);
+    }
+    if (convertCommand->parsed()) {
+        return runReportCommand(convert.command(), "convert", argc, argv);
     }
     if (templatesCommand->parsed()) {
         return kareport::TemplatesCommand{text(templatesFile), text(templatesName), templatesJson}.run();

@@ -1,0 +1,147 @@
+#include "Commands.h"
+
+#include "CommandSetup.h"
+#include "FileBytes.h"
+#include "JobReader.h"
+#include "JobRunner.h"
+#include "OutputsWriter.h"
+#include "PageHeader.h"
+#include "ReportTextDecoder.h"
+#include "RichTextReader.h"
+#include "Xlate.h"
+
+#include <QGuiApplication>
+#include <QJsonArray>
+#include <QTextDocument>
+
+namespace kareport
+{
+
+namespace
+{
+
+/// What stands in a saved report.
+struct SavedReport
+{
+    QString text; ///< lines ended by CR LF
+    QStringList warnings;
+};
+
+/// Reads a report file or plain text. @return what is wrong with it; nothing when all was read
+std::optional<InputError> readText(const QString &path, QByteArrayView bytes, SavedReport &saved)
+{
+    if (bytes.startsWith("%PDF")) {
+        return InputError{path, TextPlace(), Xlate("a saved report was expected; this is a PDF")};
+    }
+    if (const auto place = decodeReportText(bytes, saved.text)) {
+        return InputError{path, *place, Xlate("a report file was expected; this is no UTF-8")};
+    }
+    return std::nullopt;
+}
+
+std::optional<InputError> readRichText(const QString &path, QByteArrayView bytes, SavedReport &saved)
+{
+    QTextDocument document;
+    RichTextNotes notes;
+    if (const auto error = kareport::readRichText(bytes, document, &notes)) {
+        return InputError{path, error->place, error->text};
+    }
+    saved.text = document.toPlainText();
+    if (!saved.text.isEmpty() && !saved.text.endsWith(u'\n')) {
+        saved.text += u'\n'; // the last paragraph is a line as well
+    }
+    saved.text.replace(u'\n', QStringLiteral("\r\n"));
+    saved.warnings = notes.texts();
+    return std::nullopt;
+}
+
+/// Writes a text into a report that is kept in rich-text mode as well: line by line, as reports are written.
+void writeLines(UReportDoc &report, QStringView text)
+{
+    while (!text.isEmpty()) {
+        const qsizetype feed = text.indexOf(u'\n');
+        QStringView line = text.first(feed < 0 ? text.size() : feed);
+        text = text.sliced(feed < 0 ? text.size() : feed + 1);
+        if (feed >= 0 && line.endsWith(u'\r')) {
+            line.chop(1);
+        }
+        report.Write(line.toString(), 0);
+        report.LineFeed(feed < 0 ? 0 : 1);
+    }
+}
+
+} // namespace
+
+std::optional<QString> ConvertCommand::usageError() const
+{
+    if (const auto wrong = wrongKindName(as)) {
+        return wrong;
+    }
+    for (const QString &set : sets) {
+        if (!set.startsWith(u"page.")) {
+            return Xlate("--set \"%1\": a key of the page was expected, as page.linesPerPage=60").arg(set);
+        }
+    }
+    return wrongOutput(output, as);
+}
+
+ExitStatus ConvertCommand::run(int &argc, char **argv) const
+{
+    JsonSource source = JsonSource::fromObject({{QStringLiteral("report"), QJsonArray()}});
+    if (const auto wrong = applySets(source, sets)) {
+        return usageExit(*wrong);
+    }
+    Job job = readJob(source, std::nullopt);
+    if (source.error()) {
+        return usageExit(source.error()->message());
+    }
+    job.outputs = {{output, *outputKindOf(output, outputKindFromName(as))}};
+
+    auto file = FileBytes::open(input);
+    if (const InputError *error = errorOf(file)) {
+        printError(error->message());
+        return exitInput;
+    }
+    const std::string_view view = std::get<std::shared_ptr<const FileBytes>>(file)->view();
+    const QByteArrayView bytes(view.data(), static_cast<qsizetype>(view.size()));
+    const bool isRich = isRichText(bytes);
+    SavedReport saved;
+    std::optional<InputError> error = isRich ? std::nullopt : readText(input, bytes, saved);
+    // The pages of a PDF are those that the report was written in; no other kind has pages.
+    if (!job.page.linesPerPage) {
+        job.page.linesPerPage = job.outputs.front().kind == OutputKind::Pdf
+                                    ? linesBetweenPageHeaders(saved.text, Xlate("   Page:@@Report Header"))
+                                    : PageGeometry().linesPerPage;
+    }
+    job.page.charsPerRow = job.page.charsPerRow.value_or(PageGeometry().charsPerRow);
+    const auto application = startQt(argc, argv, isRich || JobRunner::needsFonts(job) || needsFonts(job.outputs));
+    if (isRich) {
+        error = readRichText(input, bytes, saved);
+    }
+    if (error) {
+        printError(error->message());
+        return exitInput;
+    }
+    Progress bar(progress);
+    JobRunner runner(job, source, bar);
+    error = runner.run();
+    if (error) {
+        printError(error->message());
+        return exitInput;
+    }
+    UReportDoc &report = runner.report();
+    if (report.GetRTFDataFlag()) {
+        writeLines(report, saved.text);
+    } else {
+        report.Write(saved.text, 0);
+    }
+    // The report holds it all now.
+    file = InputError();
+    saved.text = QString();
+    for (const QString &warning : quiet ? QStringList() : saved.warnings) {
+        printError(Xlate("kareport: warning: \"%1\": %2").arg(input, warning));
+    }
+    return writeOutputs(report, job.outputs, bar, quiet);
+}
+
+} // namespace kareport

@@ -1,0 +1,58 @@
+#include "OutputsWriter.h"
+
+#include "Interrupt.h"
+#include "OutputWriter.h"
+#include "Xlate.h"
+
+#include <algorithm>
+
+namespace kareport
+{
+
+namespace
+{
+
+ExitStatus stoppedBefore(const Output &output)
+{
+    printError(Xlate("kareport: stopped before \"%1\" was written").arg(output.file));
+    return exitInterrupted;
+}
+
+} // namespace
+
+bool needsFonts(const std::vector<Output> &outputs)
+{
+    return std::any_of(outputs.begin(), outputs.end(),
+                       [](const Output &output) { return output.kind == OutputKind::RichText; });
+}
+
+ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, Progress &progress, bool quiet)
+{
+    ExitStatus status = exitDone;
+    for (const Output &output : outputs) {
+        if (isInterrupted()) {
+            return stoppedBefore(output);
+        }
+        if (!output.isStandardOutput()) {
+            progress.begin(Xlate("Writing %1").arg(output.file), 0);
+        }
+        QStringList warnings;
+        const auto error = writeOutput(report, output, progress, warnings);
+        progress.finish();
+        if (error && isInterrupted()) {
+            return stoppedBefore(output);
+        }
+        for (const QString &warning : quiet ? QStringList() : warnings) {
+            printError(Xlate("kareport: warning: \"%1\": %2").arg(output.file, warning));
+        }
+        if (error) {
+            printError(QStringLiteral("kareport: ") + *error);
+            status = exitOutput;
+        } else if (!quiet && report.IsEmpty() && output.kind == OutputKind::Report) {
+            printError(Xlate("kareport: the report is empty: \"%1\" was not written").arg(output.file));
+        }
+    }
+    return status;
+}
+
+} // namespace kareport

@@ -1,0 +1,19 @@
+#pragma once
+
+#include "KaReportExport.h"
+#include "TextPlaces.h"
+
+#include <QByteArrayView>
+#include <QString>
+
+#include <optional>
+
+namespace kareport
+{
+
+/// Turns the bytes of a report file back into the report text that was written: the inverse of writing it. A file without
+/// a byte-order mark is a text that somebody else wrote; its lines, ended by LF or CR LF, get CR LF.
+/// @return where the file is no UTF-8; nothing when all of it was read
+KAREPORT_EXPORT std::optional<TextPlace> decodeReportText(QByteArrayView bytes, QString &text);
+
+} // namespace kareport

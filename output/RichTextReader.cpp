@@ -1,0 +1,90 @@
+#include "RichTextReader.h"
+
+#include "RichTextParser.h"
+#include "Xlate.h"
+
+#include <QStringEncoder>
+#include <QTextDocument>
+
+#include <algorithm>
+
+namespace kareport
+{
+
+namespace
+{
+
+constexpr char beginning[] = "{\\rtf";
+
+TextPlace placeOf(QByteArrayView bytes, qsizetype position, RichTextRawBytes rawBytes)
+{
+    const QByteArrayView before = bytes.first(position);
+    const QByteArrayView line = before.sliced(before.lastIndexOf('\n') + 1);
+    const auto continues = std::count_if(line.begin(), line.end(), [rawBytes](char byte) {
+        return rawBytes == RichTextRawBytes::Utf8 && (static_cast<unsigned char>(byte) & 0xC0) == 0x80;
+    });
+    return {before.count('\n') + 1, line.size() - continues + 1};
+}
+
+std::optional<RichTextError> readBytes(QByteArrayView bytes, RichTextRawBytes rawBytes, QTextDocument &document,
+                                       RichTextNotes *notes)
+{
+    if (notes != nullptr) {
+        *notes = {};
+    }
+    if (!isRichText(bytes)) {
+        document.clear();
+        return RichTextError{{},
+                             Xlate("%1 was expected, with which a rich text begins").arg(QLatin1StringView(beginning))};
+    }
+    RichTextParser parser(bytes, rawBytes, document);
+    const QString error = parser.read();
+    if (notes != nullptr) {
+        *notes = parser.notes();
+    }
+    if (error.isEmpty()) {
+        return std::nullopt;
+    }
+    return RichTextError{placeOf(bytes, parser.position(), rawBytes), error};
+}
+
+} // namespace
+
+QStringList RichTextNotes::texts() const
+{
+    QStringList sentences;
+    const auto add = [&sentences](int count, const char *sentence) {
+        if (count > 0) {
+            sentences.append(Xlate(sentence).arg(count));
+        }
+    };
+    add(pictures, "Pictures are not shown: %1.");
+    add(objects, "Embedded objects and drawings are not shown: %1.");
+    add(footnotes, "Footnotes and comments are not shown: %1.");
+    add(headers, "Page headers and footers are not shown: %1.");
+    return sentences;
+}
+
+bool isRichText(QByteArrayView bytes)
+{
+    return bytes.startsWith(beginning);
+}
+
+bool isRichText(QStringView text)
+{
+    return text.startsWith(QLatin1StringView(beginning));
+}
+
+std::optional<RichTextError> readRichText(QByteArrayView bytes, QTextDocument &document, RichTextNotes *notes)
+{
+    return readBytes(bytes, RichTextRawBytes::CodePage, document, notes);
+}
+
+std::optional<RichTextError> readRichText(QStringView text, QTextDocument &document, RichTextNotes *notes)
+{
+    QStringEncoder encode(QStringEncoder::Utf8);
+    const QByteArray bytes = encode(text);
+    return readBytes(bytes, RichTextRawBytes::Utf8, document, notes);
+}
+
+} // namespace kareport

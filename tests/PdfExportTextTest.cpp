@@ -1,0 +1,212 @@
+#include "PdfFixture.h"
+
+#include <gtest/gtest.h>
+
+#include <chrono>
+#include <string>
+#include <thread>
+
+// What stands in a PDF, read back as text.
+
+namespace
+{
+
+using kareport::PdfNotes;
+using kareport::PdfOptions;
+
+TEST(PdfExportText, LinesStandOnTheirPages)
+{
+    struct Row
+    {
+        QString text;
+        qint64 lineCount;
+        QStringList expected;
+        const char *reason;
+    };
+    const QString sixty = QStringLiteral("line\r\n").repeated(59) + QStringLiteral("last of 60\r\n");
+    const auto full = [](const char *last) { return QStringLiteral("line\n").repeated(59) + QString::fromUtf8(last); };
+    const Row rows[] = {
+        {QStringLiteral("A\r\n"), 1, {QStringLiteral("A")}, "one line"},
+        {QStringLiteral("A"), 1, {QStringLiteral("A")}, "without its end"},
+        {QStringLiteral("A\r\n\r\n\r\nB\r\n"), 4, {QStringLiteral("A\n\n\nB")}, "empty lines"},
+        {sixty, 60, {full("last of 60")}, "the last line of a full page is there"},
+        {sixty + QStringLiteral("61st\r\n"), 61, {full("last of 60"), QStringLiteral("61st")}, "one line more"},
+        {sixty + sixty, 120, {full("last of 60"), full("last of 60")}, "two full pages"},
+        {sixty + QStringLiteral("61st\r\n"),
+         1,
+         {full("last of 60"), QStringLiteral("61st")},
+         "an edited text with more lines than were counted"},
+        {QStringLiteral("A\r\n"),
+         121,
+         {QStringLiteral("A"), QString(), QString()},
+         "an edited text with fewer lines: the blank pages stay"},
+        {QString(), 61, {QString(), QString()}, "nothing is left of it"},
+        {QString(60, u'\n'), 60, {QString()}, "empty lines alone"},
+    };
+    for (const Row &row : rows) {
+        const PdfReadBack pdf(pdfBytes(row.text, pdfOptions(row.lineCount)));
+        EXPECT_EQ(pdf.pages(), row.expected) << row.reason;
+        EXPECT_EQ(pdf.pageCount(), row.expected.size()) << row.reason;
+        EXPECT_EQ(pdf.check(), QString()) << row.reason;
+    }
+}
+
+TEST(PdfExportText, AReportWithoutLinesHasNoPage)
+{
+    const QByteArray bytes = pdfBytes(u"", pdfOptions(0));
+    EXPECT_TRUE(bytes.startsWith("%PDF-"));
+    EXPECT_TRUE(bytes.trimmed().endsWith("%%EOF"));
+    EXPECT_TRUE(bytes.contains("/Count 0")) << "the library writes it as it stands";
+}
+
+TEST(PdfExportText, IsWhatIsSeenOfTheReport)
+{
+    struct Row
+    {
+        QStringView line;
+        QStringView expected;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {u"(a) \\ <b> [c] {d} %e /f", u"(a) \\ <b> [c] {d} %e /f", "what has a meaning in a PDF"},
+        {u"0\t1\t12345678\t2", u"0       1       12345678        2", "tabs lead to every eighth column"},
+        {u"a\rb", u"ab", "a lone CR ends nothing and draws nothing"},
+        {u"a\fb", u"ab", "a form feed begins no page"},
+        {QStringView(u"a\0b", 3), u"ab", "a zero ends nothing"},
+        {u"a\u2028b\u2029c", u"abc", "separators end nothing"},
+        {u"é°ßÄ½", u"é°ßÄ½", "Latin-1"},
+        {u"\u0129\u0A28\u5C28\u295C\u0D5C", u"\u0129\u0A28\u5C28\u295C\u0D5C",
+         "codes whose bytes are brackets, a backslash, a line end"},
+        {u"∞ ≤ Ω", u"∞ ≤ Ω", "signs"},
+        {u"測量 é ∞", u"測量 é ∞", "CJK among others"},
+        {u"a\xD83Dz", u"a\uFFFDz", "half a pair"},
+        {u"a\xDE00", u"a\uFFFD", "the other half, at the end"},
+    };
+    for (const Row &row : rows) {
+        PdfNotes notes;
+        const PdfReadBack pdf(
+            pdfBytes(QString(row.line.toString() + QStringLiteral("\r\nnext\r\n")), pdfOptions(2), &notes));
+        EXPECT_EQ(pdf.pages(), QStringList{row.expected.toString() + QStringLiteral("\nnext")}) << row.reason;
+        EXPECT_EQ(pdf.check(), QString()) << row.reason;
+        EXPECT_EQ(notes.warnings(), QStringList()) << row.reason;
+    }
+}
+
+TEST(PdfExportText, AWideLineGoesOnBelow)
+{
+    // 5.418 points a character, 523.32 points of room: 96 characters.
+    const std::u16string x96(96, u'x');
+    struct Row
+    {
+        std::u16string line;
+        std::u16string expected;
+        const char *reason;
+    };
+    const Row rows[] = {
+        {x96, x96, "fills the box"},
+        {x96 + u"y", x96 + u"\ny", "a word that is wider than the box is broken at its edge"},
+        {x96 + x96 + u"y z", x96 + u"\n" + x96 + u"\ny z", "and goes on"},
+        {x96 + u" y", x96 + u"\ny", "a blank that crosses the edge is the break"},
+        {x96.substr(1) + u" y", x96.substr(1) + u"\ny", "a blank in the last place is the break"},
+        {u"ab " + x96, u"ab\n" + x96, "a word that does not fit goes below"},
+        {u"ab " + x96 + u"y", u"ab\n" + x96 + u"\ny", "also one that is broken there"},
+        {x96 + std::u16string(40, u' '), x96, "blanks beyond the edge need no line"},
+        {std::u16string(200, u' '), u"", "blanks alone"},
+        {u"\t\t\t\t\t\t\t\t\t\t\t\tx", u"\nx", "tabs up to the edge"},
+    };
+    for (const Row &row : rows) {
+        const std::u16string text = row.line + u"\r\nnext\r\n";
+        const PdfReadBack pdf(pdfBytes(QStringView(text), pdfOptions(2)));
+        EXPECT_EQ(pdf.pages(), QStringList{QString::fromStdU16String(row.expected + u"\nnext")}) << row.reason;
+    }
+}
+
+TEST(PdfExportText, AFullPageOfBrokenLinesLosesNone)
+{
+    QString text;
+    for (int line = 1; line <= 61; ++line) {
+        text += QStringLiteral("%1 %2\r\n").arg(QString(250, QChar(u'a' + line % 26))).arg(line);
+    }
+    const PdfReadBack pdf(pdfBytes(text, pdfOptions(61)));
+    EXPECT_EQ(pdf.pageCount(), 2);
+    EXPECT_EQ(pdf.characters(), QString(text).remove(u' ').remove(u'\r').remove(u'\n'));
+    for (const PdfWord &word : pdf.words()) {
+        EXPECT_GE(word.left, 35.9) << word.text.toStdString();
+        EXPECT_LE(word.right, 595.32 - 35.9) << word.text.toStdString();
+        EXPECT_GE(word.top, 35.9) << word.text.toStdString();
+        EXPECT_LE(word.bottom, 841.92 - 35.9) << word.text.toStdString();
+    }
+}
+
+TEST(PdfExportText, APageMayHoldMoreThanALibraryCallTakes)
+{
+    QString words;
+    while (words.size() < 70000) {
+        words += QString::number(words.size()) + u' ';
+    }
+    const QString word(70000, u'x');
+    const QString wide = QStringLiteral("測").repeated(23000);
+    for (const QString &text : {words, word, wide}) {
+        PdfOptions options = pdfOptions(1);
+        const PdfReadBack pdf(pdfBytes(QString(text + QStringLiteral("\r\nend\r\n")), options));
+        EXPECT_EQ(pdf.pageCount(), 1);
+        EXPECT_EQ(pdf.characters(), QString(text).remove(u' ') + QStringLiteral("end"));
+        EXPECT_EQ(pdf.check(), QString());
+    }
+}
+
+TEST(PdfExportText, ACharacterThatNoFaceHasIsReported)
+{
+    PdfNotes notes;
+    const QString text = pdfLines(QStringLiteral("A\n😀 B 😀😀\n𝔸 C\n😀\n"));
+    const PdfReadBack pdf(pdfBytes(text, pdfOptions(4), &notes));
+    EXPECT_EQ(pdf.pages(), QStringList{QStringLiteral("A\n\uFFFD B \uFFFD\uFFFD\n\uFFFD C\n\uFFFD")});
+    ASSERT_EQ(notes.missing.size(), 2U);
+    EXPECT_EQ(notes.missing[0].character, U'😀');
+    EXPECT_EQ(notes.missing[0].count, 4);
+    EXPECT_EQ(notes.missing[0].firstLine, 2);
+    EXPECT_EQ(notes.missing[1].character, U'𝔸');
+    EXPECT_EQ(notes.missing[1].count, 1);
+    EXPECT_EQ(notes.missing[1].firstLine, 3);
+    EXPECT_EQ(notes.warnings(),
+              (QStringList{
+                  QStringLiteral("no font has the character \"😀\" (U+1F600), first in line 2, 4 times in all"),
+                  QStringLiteral("no font has the character \"𝔸\" (U+1D538), first in line 3, 1 times in all"),
+              }));
+    EXPECT_EQ(notes.problem, QString());
+}
+
+TEST(PdfExportText, TheLineOfAMissingCharacterIsCountedOverAllPages)
+{
+    PdfNotes notes;
+    const QString text = QStringLiteral("line\r\n").repeated(130) + QStringLiteral("😀\r\n");
+    pdfBytes(text, pdfOptions(131), &notes);
+    ASSERT_EQ(notes.missing.size(), 1U);
+    EXPECT_EQ(notes.missing[0].firstLine, 131);
+}
+
+TEST(PdfExportText, OneByteAndTwoByteTextsGiveTheSameFile)
+{
+    std::string bytes = "Tab\tb\r\nlone\rCR\r\n\x85\x7F\xA0\xE9\xB0\xFF trailing   \r\n";
+    bytes += std::string(300, 'x') + "\r\nlast";
+    for (const std::string &text : {bytes, std::string(), std::string("\r\n")}) {
+        const PdfOptions options = pdfOptions(5);
+        QBuffer buffer;
+        buffer.open(QIODevice::WriteOnly);
+        const QLatin1StringView narrow(text.data(), static_cast<qsizetype>(text.size()));
+        ASSERT_TRUE(kareport::writePdf(buffer, narrow, options));
+        EXPECT_EQ(buffer.data(), pdfBytes(QString(narrow), options));
+    }
+}
+
+TEST(PdfExportText, TheSameReportGivesTheSameBytes)
+{
+    const QString text = pdfLines(QStringLiteral("A é ∞ 測量\n😀\n"));
+    const QByteArray first = pdfBytes(text);
+    // No date of the second in which it was written.
+    std::this_thread::sleep_for(std::chrono::milliseconds(1100));
+    EXPECT_EQ(first, pdfBytes(text));
+    EXPECT_FALSE(first.contains("CreationDate"));
+}
+
+} // namespace

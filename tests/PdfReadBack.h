@@ -1,0 +1,184 @@
+#pragma once
+
+#include <QByteArray>
+#include <QFile>
+#include <QImage>
+#include <QProcess>
+#include <QRect>
+#include <QRegularExpression>
+#include <QString>
+#include <QStringList>
+#include <QTemporaryDir>
+
+#include <gtest/gtest.h>
+
+#include <vector>
+
+// PDFs read back with other people's tools.
+
+/// A word of a page and where it stands, in points from the sheet's upper left corner.
+struct PdfWord
+{
+    QString text;
+    double left = 0;
+    double top = 0;
+    double right = 0;
+    double bottom = 0;
+};
+
+/// An embedded face, as it is listed.
+struct PdfFont
+{
+    QString name;
+    QString type;
+    bool isEmbedded = false;
+    bool isSubset = false;
+};
+
+/// A PDF in a folder of its own.
+class PdfReadBack
+{
+public:
+    explicit PdfReadBack(const QByteArray &bytes) : path_(folder_.filePath(QStringLiteral("a.pdf")))
+    {
+        QFile file(path_);
+        EXPECT_TRUE(file.open(QIODevice::WriteOnly));
+        EXPECT_EQ(file.write(bytes), bytes.size());
+    }
+
+    /// The text of every page, as it is laid out; lines without the blanks at their end, pages without empty lines at
+    /// theirs.
+    QStringList pages() const
+    {
+        QStringList texts =
+            QString::fromUtf8(run("pdftotext", {QStringLiteral("-layout"), path_, QStringLiteral("-")})).split(u'\f');
+        texts.removeLast(); // every page ends with a form feed
+        for (QString &text : texts) {
+            while (text.endsWith(u'\n')) {
+                text.chop(1);
+            }
+        }
+        return texts;
+    }
+
+    /// All that is written on all pages, in the order of writing, without blanks and line ends.
+    QString characters() const
+    {
+        QString text = QString::fromUtf8(run("pdftotext", {QStringLiteral("-raw"), path_, QStringLiteral("-")}));
+        return text.remove(QRegularExpression(QStringLiteral("[ \n\f]")));
+    }
+
+    int pageCount() const { return info("Pages").toInt(); }
+    /// Of the first page, as "612 x 792 pts (letter)".
+    QString pageSize() const { return info("Page size"); }
+
+    std::vector<PdfFont> fonts() const
+    {
+        // The columns after the name: type, encoding, emb, sub, uni, object.
+        static const QRegularExpression row(
+            QStringLiteral("^(\\S+) +(\\S.*?) +(\\S+) +(yes|no) +(yes|no) +(yes|no) +\\d+ +\\d+$"));
+        std::vector<PdfFont> fonts;
+        for (const QString &line : QString::fromUtf8(run("pdffonts", {path_})).split(u'\n').mid(2)) {
+            if (const auto match = row.match(line.trimmed()); match.hasMatch()) {
+                fonts.push_back(
+                    {match.captured(1), match.captured(2), match.captured(4) == u"yes", match.captured(5) == u"yes"});
+            } else {
+                EXPECT_TRUE(line.isEmpty()) << line.toStdString();
+            }
+        }
+        return fonts;
+    }
+
+    /// The words of a page, from 1.
+    std::vector<PdfWord> words(int page = 1) const
+    {
+        static const QRegularExpression word(
+            QStringLiteral("<word xMin=\"(.*?)\" yMin=\"(.*?)\" xMax=\"(.*?)\" yMax=\"(.*?)\">(.*?)</word>"));
+        const QString number = QString::number(page);
+        const QString text =
+            QString::fromUtf8(run("pdftotext", {QStringLiteral("-bbox"), QStringLiteral("-f"), number,
+                                                QStringLiteral("-l"), number, path_, QStringLiteral("-")}));
+        std::vector<PdfWord> words;
+        for (auto match = word.globalMatch(text); match.hasNext();) {
+            const auto found = match.next();
+            words.push_back({found.captured(5), found.captured(1).toDouble(), found.captured(2).toDouble(),
+                             found.captured(3).toDouble(), found.captured(4).toDouble()});
+        }
+        return words;
+    }
+
+    /// Checks the file's structure. @return what is wrong; empty when nothing is
+    QString check() const
+    {
+        QProcess process;
+        process.setProcessChannelMode(QProcess::MergedChannels);
+        process.start(QStringLiteral("qpdf"), {QStringLiteral("--check"), path_}, QIODevice::ReadOnly);
+        const bool ended = process.waitForFinished(60'000);
+        const QString said = QString::fromUtf8(process.readAll());
+        return ended && process.exitStatus() == QProcess::NormalExit && process.exitCode() == 0
+                   ? QString()
+                   : QStringLiteral("qpdf: ") + said;
+    }
+
+    /// A page, from 1, in grey.
+    QImage picture(int page = 1, int dotsPerInch = 100) const
+    {
+        const QString number = QString::number(page);
+        const QString stem = folder_.filePath(QStringLiteral("page"));
+        run("pdftoppm",
+            {QStringLiteral("-r"), QString::number(dotsPerInch), QStringLiteral("-gray"), QStringLiteral("-png"),
+             QStringLiteral("-singlefile"), QStringLiteral("-f"), number, path_, stem});
+        const QImage image(stem + QStringLiteral(".png"));
+        EXPECT_FALSE(image.isNull());
+        return image.convertToFormat(QImage::Format_Grayscale8);
+    }
+
+private:
+    QByteArray run(const char *program, const QStringList &arguments) const
+    {
+        QProcess process;
+        process.start(QString::fromUtf8(program), arguments, QIODevice::ReadOnly);
+        const bool ended = process.waitForFinished(60'000);
+        EXPECT_TRUE(ended && process.exitStatus() == QProcess::NormalExit && process.exitCode() == 0)
+            << program << ": " << process.readAllStandardError().toStdString();
+        EXPECT_EQ(process.readAllStandardError().toStdString(), "") << program;
+        return process.readAllStandardOutput();
+    }
+
+    QString info(const char *entry) const
+    {
+        const QString name = QString::fromUtf8(entry) + u':';
+        for (const QString &line : QString::fromUtf8(run("pdfinfo", {path_})).split(u'\n')) {
+            if (line.startsWith(name)) {
+                return line.mid(name.size()).trimmed();
+            }
+        }
+        return {};
+    }
+
+    QTemporaryDir folder_;
+    QString path_;
+};
+
+/// The part of a picture that is not white, and how much black there is in it (in whole dots).
+struct Ink
+{
+    QRect box;
+    double amount = 0;
+};
+
+inline Ink inkIn(const QImage &image, const QRect &area)
+{
+    Ink ink;
+    const QRect part = area.intersected(image.rect());
+    for (int y = part.top(); y <= part.bottom(); ++y) {
+        for (int x = part.left(); x <= part.right(); ++x) {
+            const int darkness = 255 - qGray(image.pixel(x, y));
+            ink.amount += darkness / 255.0;
+            if (darkness > 40) {
+                ink.box |= QRect(x, y, 1, 1);
+            }
+        }
+    }
+    return ink;
+}
