@@ -4,6 +4,14 @@
 
 #include <sys/resource.h>
 
+/// The peak memory of the process in KB.
+inline long peakMemory()
+{
+    rusage usage{};
+    getrusage(RUSAGE_SELF, &usage);
+    return usage.ru_maxrss;
+}
+
 /// Splits the time of a benchmark into the program's own and the system's, per item: where memory is fetched from the
 /// system, how fast the system gives pages says nothing about how our cost grows.
 class ProcessorTime

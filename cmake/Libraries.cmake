@@ -27,4 +27,4 @@ ka_shared_library(KaReportHost ${KA_HOST_LAYERS})
 target_link_libraries(KaReportHost PUBLIC Qt6::Core)
 
 ka_shared_library(KaReport ${KA_MODULE_LAYERS})
-target_link_libraries(KaReport PUBLIC KaReportHost Qt6::Gui PRIVATE Qt6::PrintSupport Fontconfig::Fontconfig ${HPDF_LIBRARY})
+target_link_libraries(KaReport PUBLIC KaReportHost Qt6::Gui PRIVATE Qt6::PrintSupport Fontconfig::Fontconfig Freetype::Freetype ${HPDF_LIBRARY})

@@ -23,7 +23,8 @@ QString printableText(const QString &text)
 {
     QString result = text;
     for (QChar &character : result) {
-        if (!character.isPrint()) {
+        const bool isLineEnd = character == QChar::LineSeparator || character == QChar::ParagraphSeparator;
+        if (isLineEnd || !character.isPrint()) {
             character = u' ';
         }
     }

@@ -28,6 +28,9 @@ public:
         if (setup.resolution == 0 || setup.linesPerPage < 1) {
             return fail(Xlate("the page has not been measured"));
         }
+        if (setup.fontSize == 0) {
+            return fail(Xlate("a font size of 1 point or more was expected"));
+        }
         box_ = pdfPageBox(setup);
         if (!loadFaces()) {
             return false;
@@ -35,7 +38,8 @@ public:
         const qint64 pages = std::max<qint64>(0, (options_.lineCount - 1 + setup.linesPerPage) / setup.linesPerPage);
         const qint64 lines = linesOfText();
         linesToFit_ = linesToFit(setup, box_, typesetter_.height(), lines);
-        if (!pdf_.expectPages(std::max(pages, lines / setup.linesPerPage + 1)) || !addPages(pages)) {
+        pages_ = std::max(pages, pagesOfText());
+        if (!pdf_.expectPages(pages_) || !addPages()) {
             return fail(libraryError());
         }
         // A device that fails says why itself.
@@ -83,17 +87,24 @@ private:
 
     qint64 linesOfText() const { return std::count(text_.begin(), text_.end(), typename Text::value_type('\n')) + 1; }
 
-    bool addPages(qint64 pages)
+    /// An edited text may have more lines than were counted when it was written; they get their pages, too.
+    qint64 pagesOfText() const
+    {
+        const qint64 feeds = linesOfText() - 1;
+        const bool lineIsOpen = !text_.isEmpty() && text_.back() != QChar(u'\n');
+        return (feeds + (lineIsOpen ? 1 : 0) + options_.page.linesPerPage - 1) / options_.page.linesPerPage;
+    }
+
+    bool addPages()
     {
         qsizetype begin = 0;
-        // An edited text may have more lines than were counted when it was written; they get their pages, too.
-        for (qint64 page = 0; page < pages || begin < text_.size(); ++page) {
+        for (qint64 page = 0; page < pages_; ++page) {
             const qsizetype end = pageEnd(text_, begin, options_.page.linesPerPage);
             if (!addPage(begin, end)) {
                 return false;
             }
             begin = end;
-            if (options_.progress && !options_.progress(page + 1, pages)) {
+            if (options_.progress && !options_.progress(page + 1, pages_)) {
                 return fail(Xlate("stopped"));
             }
         }
@@ -162,6 +173,7 @@ private:
     PdfTypesetter typesetter_;
     PdfPageBox box_;
     qsizetype linesToFit_ = 1; ///< on a page
+    qint64 pages_ = 0;
     int widest_ = 0;
     std::vector<char32_t> uncovered_; ///< in order
     QChar substitute_;

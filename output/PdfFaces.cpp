@@ -145,7 +145,6 @@ std::optional<PdfFace> preferredPdfFace(const QStringList &fontFolders)
 
 std::vector<PdfFace> fixedPitchPdfFaces()
 {
-    // These draw their composite glyphs right when they are embedded; not every fixed-pitch face does.
     static constexpr const char *families[] = {"DejaVu Sans Mono", "Liberation Mono", "Hack", "WenQuanYi Zen Hei Mono",
                                                "WenQuanYi Zen Hei"};
     std::vector<PdfFace> faces;

@@ -12,6 +12,8 @@ constexpr double pointsPerInch = 72;
 constexpr double hundredthsPerInch = 2540;
 /// The smallest distance and size that the numbers of a PDF can still say.
 constexpr double smallest = 0.01;
+/// The closest that lines stand, in font heights: closer, and descenders would run into what is below.
+constexpr double closest = 0.75;
 
 double marginPoints(int margin)
 {
@@ -37,7 +39,7 @@ PdfPageBox pdfPageBox(const PdfPageSetup &setup)
 qsizetype linesToFit(const PdfPageSetup &setup, const PdfPageBox &box, const FaceHeight &face, qsizetype linesOfReport)
 {
     const qsizetype lines = setup.linesPerPage;
-    return placeLines(setup, box, face, lines, lines).leading < static_cast<float>(setup.fontSize)
+    return placeLines(setup, box, face, lines, lines).leading < static_cast<float>(closest * setup.fontSize)
                ? std::clamp<qsizetype>(linesOfReport, 1, lines)
                : lines;
 }
@@ -53,8 +55,9 @@ LinePlacement placeLines(const PdfPageSetup &setup, const PdfPageBox &box, const
     if (gaps > 0) {
         leading = std::min(leading, (boxHeight - leading) / gaps);
     }
-    if (leading < size) {
-        leading = size = std::min(size, boxHeight / (gaps + faceHeight));
+    if (leading < closest * size) {
+        leading = std::min(closest * size, boxHeight / (gaps + faceHeight / closest));
+        size = leading / closest;
     }
     if (lines > linesToFit) {
         const double needed = leading * static_cast<double>(lines - 1) + faceHeight * size;

@@ -52,8 +52,8 @@ KAREPORT_EXPORT qsizetype linesToFit(const PdfPageSetup &setup, const PdfPageBox
                                      qsizetype linesOfReport);
 
 /// Places the lines of a page in its box: as far apart as the face is high or, where the lines that a page has to have
-/// room for do not fit then, as close as they have to be. Lines never touch: the font is made smaller where it is higher
-/// than they are apart, and a page with more lines than expected, because some had to be broken, is made smaller as a whole.
+/// room for do not fit then, as close as they have to be. Lines never run into each other: the font is made smaller where they
+/// would, and a page with more lines than expected, because some had to be broken, is made smaller as a whole.
 /// @param linesToFit  lines that every page has room for
 /// @param lines       lines that this page has after breaking
 KAREPORT_EXPORT LinePlacement placeLines(const PdfPageSetup &setup, const PdfPageBox &box, const FaceHeight &face,

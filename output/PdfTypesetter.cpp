@@ -1,5 +1,7 @@
 #include "PdfTypesetter.h"
 
+#include <hpdf_font.h>
+#include <hpdf_fontdef.h>
 #include <hpdf_pages.h>
 #include <hpdf_streams.h>
 
@@ -47,7 +49,7 @@ bool PdfTypesetter::loadFaces(PdfDocument &pdf, const std::vector<PdfFace> &face
             failedFace_ = face.file();
             return false;
         }
-        faces_.push_back({face, font});
+        faces_.push_back({face, font, GlyphParts(face)});
     }
     faceOf_.assign(planeSize, unknownFace);
     widths_.assign(planeSize, -1);
@@ -83,9 +85,24 @@ int PdfTypesetter::width(char32_t character)
     short &width = widths_[character & 0xFFFF];
     if (width < 0) {
         const auto code = static_cast<char16_t>(character);
-        width = static_cast<short>(std::max(0, HPDF_Font_GetUnicodeWidth(faces_[faceOf(code)].font, code)));
+        const Entry &entry = faces_[faceOf(code)];
+        width = static_cast<short>(std::max(0, HPDF_Font_GetUnicodeWidth(entry.font, code)));
+        embedParts(entry, code);
     }
     return width;
+}
+
+void PdfTypesetter::embedParts(const Entry &entry, char16_t character)
+{
+    // The library embeds the parts of a glyph, but not the parts of the parts, and none beyond the 32767th glyph: the
+    // Greek epsilon or a Hangul syllable would stay blank.
+    const auto *font = static_cast<HPDF_FontAttr>(entry.font->attr);
+    const auto *face = static_cast<HPDF_TTFontDefAttr>(font->fontdef->attr);
+    for (const unsigned part : entry.parts.of(HPDF_TTFontDef_GetGlyphid(font->fontdef, character))) {
+        if (part < face->num_glyphs) {
+            face->glyph_tbl.flgs[part] = 1;
+        }
+    }
 }
 
 bool PdfTypesetter::addPage(PdfDocument &pdf, const PdfPageBox &box, const LinePlacement &placement,

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "GlyphParts.h"
 #include "PdfDocument.h"
 #include "PdfGeometry.h"
 
@@ -36,9 +37,11 @@ private:
     {
         PdfFace face;
         HPDF_Font font = nullptr;
+        GlyphParts parts;
     };
 
     std::size_t faceOf(char16_t character);
+    static void embedParts(const Entry &entry, char16_t character);
     void showLine(HPDF_Page page, float fontSize, QStringView line);
     void addRun(QStringView run, bool onNextLine);
     void writeOut(HPDF_Page page);

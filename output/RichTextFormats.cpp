@@ -13,9 +13,9 @@ namespace kareport
 namespace
 {
 
-/// QTextDocument finds a format by the sum of its properties. A file can hold any number of formats that all have the same
-/// sum, and each piece of text would then be compared with all of them. A document of people never has so many; in one
-/// that has, a property of no meaning sets the further formats apart.
+/// QTextDocument finds a format by a sum over its properties, in which all lists of tab stops count the same, and all font
+/// names. A file can hold any number of formats of the same sum, and each would be compared with all before it. A document
+/// of people never has so many; in one that has, a property of no meaning sets the further formats apart.
 constexpr std::size_t formatsOfPeople = 500;
 constexpr int setsApart = QTextFormat::UserProperty + 0x4B52;
 

@@ -48,8 +48,7 @@ QString RichTextParser::read()
             error = Xlate("%1 bytes of data were expected behind \\bin").arg(token.number);
             break;
         case RichTextTokenKind::End:
-            error = Xlate("a closing brace was expected: groups that are still open: %1")
-                        .arg(openGroups());
+            error = Xlate("a closing brace was expected: groups that are still open: %1").arg(openGroups());
             break;
         case RichTextTokenKind::Text:
         case RichTextTokenKind::Byte:

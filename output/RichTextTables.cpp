@@ -112,17 +112,29 @@ RichTextTables::RichTextTables(const QTextDocument &document) : document_(docume
 {
     // The font of what names none is the first of the table, and so the default one of the file.
     addCharacters(-1, QTextCharFormat());
+    int lastCharacters = -1;
+    const auto add = [&](int index, const QTextCharFormat &format) {
+        if (!characterWords_.contains(index)) {
+            addCharacters(index, format);
+        }
+        lastCharacters = index;
+    };
+    int lastParagraph = -1;
     for (QTextBlock block = document.begin(); block.isValid(); block = block.next()) {
-        if (!paragraphWords_.contains(block.blockFormatIndex())) {
-            addParagraph(block.blockFormatIndex(), block.blockFormat());
+        if (block.blockFormatIndex() != lastParagraph) {
+            lastParagraph = block.blockFormatIndex();
+            if (!paragraphWords_.contains(lastParagraph)) {
+                addParagraph(lastParagraph, block.blockFormat());
+            }
         }
-        if (block.begin().atEnd() && !characterWords_.contains(block.charFormatIndex())) {
-            addCharacters(block.charFormatIndex(), block.charFormat());
+        auto at = block.begin();
+        if (at.atEnd() && block.charFormatIndex() != lastCharacters) {
+            add(block.charFormatIndex(), block.charFormat());
         }
-        for (auto at = block.begin(); !at.atEnd(); ++at) {
+        for (; !at.atEnd(); ++at) {
             const QTextFragment fragment = at.fragment();
-            if (!characterWords_.contains(fragment.charFormatIndex())) {
-                addCharacters(fragment.charFormatIndex(), fragment.charFormat());
+            if (fragment.charFormatIndex() != lastCharacters) {
+                add(fragment.charFormatIndex(), fragment.charFormat());
             }
         }
     }

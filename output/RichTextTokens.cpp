@@ -78,9 +78,7 @@ RichTextToken RichTextTokens::control()
             return {.kind = RichTextTokenKind::Byte, .text = {}, .byte = static_cast<char>(high * 16 + low)};
         }
     }
-    if (symbol == '\r' && at_ < bytes_.size() && bytes_[at_] == '\n') {
-        ++at_;
-    }
+    // An LF behind an escaped CR is left out before the next token.
     return {.kind = RichTextTokenKind::Symbol, .text = {}, .byte = symbol == '\r' ? '\n' : symbol};
 }
 

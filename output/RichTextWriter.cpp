@@ -6,6 +6,7 @@
 #include <QTextBlock>
 #include <QTextDocument>
 
+#include <algorithm>
 #include <utility>
 
 namespace kareport
@@ -37,6 +38,17 @@ private:
     QByteArray bytes_;
 };
 
+bool writeText(Output &out, QStringView text)
+{
+    for (qsizetype at = 0; at < text.size(); at += pieceSize) {
+        appendRichText(out.bytes(), text.sliced(at, std::min(pieceSize, text.size() - at)));
+        if (!out.pass()) {
+            return false;
+        }
+    }
+    return true;
+}
+
 } // namespace
 
 bool writeRichText(QIODevice &device, const QTextDocument &document)
@@ -63,16 +75,16 @@ bool writeRichText(QIODevice &device, const QTextDocument &document)
             // Whatever follows, the last word ends here.
             characterFormat = -1;
         }
-        if (block.begin().atEnd()) {
+        // Once for each block: it is what takes the longest here.
+        auto at = block.begin();
+        if (at.atEnd()) {
             useCharacters(block.charFormatIndex());
         }
-        for (auto at = block.begin(); !at.atEnd(); ++at) {
+        for (; !at.atEnd(); ++at) {
             const QTextFragment fragment = at.fragment();
             useCharacters(fragment.charFormatIndex());
-            if (fragment.charFormat().objectType() == QTextFormat::NoObject) {
-                appendRichText(out.bytes(), fragment.text());
-            }
-            if (!out.pass()) {
+            const bool isText = fragment.charFormat().objectType() == QTextFormat::NoObject;
+            if (isText && !writeText(out, fragment.text())) {
                 return false;
             }
         }

@@ -114,6 +114,9 @@ std::optional<bool> UReportDoc::saveViewAsRichText(const QString &path)
         const bool externalEditor = externalEditor_;
         externalEditor_ = false;
         UpdateAllViews(nullptr, 0, nullptr);
+        if (!IsReportAvailable(this)) {
+            return false; // its last view has closed it
+        }
         externalEditor_ = externalEditor;
         if (std::find(GetViews().begin(), GetViews().end(), view) == GetViews().end()) {
             continue;
@@ -207,7 +210,11 @@ void UReportDoc::SaveText()
     if (receiver == nullptr) {
         return;
     }
-    if (!receiver->OnTextReceived(textObjectId_, text) || openDocument(textObject_) == nullptr) {
+    const bool taken = receiver->OnTextReceived(textObjectId_, text);
+    if (!IsReportAvailable(this)) {
+        return; // the receiver has closed the report
+    }
+    if (!taken || openDocument(textObject_) == nullptr) {
         SetTextObject(nullptr, 0);
     }
 }

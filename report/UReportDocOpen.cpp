@@ -61,7 +61,9 @@ void UReportDoc::Serialize(UArchive &archive)
     const bool headerFlag = GetHeaderFlag();
     SetHeaderFlag(false);
     isSerializing_ = true;
-    LoadFile(archive.GetFilePath(), true);
+    if (LoadFile(archive.GetFilePath(), true) == 0) {
+        archive.Abandon(); // it has gone meanwhile
+    }
     isSerializing_ = false;
     SetHeaderFlag(headerFlag);
 }
@@ -83,12 +85,14 @@ int UReportDoc::LoadFile(const QString &path, bool keepLineEnds)
     kareport::ReportFileReader reader(file);
     bool isRichText = false;
     bool isFirst = true;
+    bool isOpen = false;
     while (reader.next()) {
         QStringView line = reader.piece();
         if (std::exchange(isFirst, false)) {
             isRichText = namesRichText(path) && kareport::isRichText(line.trimmed());
         }
-        if (isRichText && !line.endsWith(u'\n')) {
+        isOpen = isRichText && !line.endsWith(u'\n');
+        if (isOpen) {
             // A line end between the pieces of a long line could cut a control word in two.
             page_.write(line, 0);
             continue;
@@ -96,10 +100,15 @@ int UReportDoc::LoadFile(const QString &path, bool keepLineEnds)
         if (!keepLineEnds && line.endsWith(u'\n')) {
             line.chop(1);
         }
-        if (GetLineCount() == 0 && line.indexOf(firstWord) > 0) {
+        // What stands before the first word of a report is the byte-order mark; in rich text it is the head.
+        if (!isRichText && GetLineCount() == 0 && line.indexOf(firstWord) > 0) {
             line = line.sliced(line.indexOf(firstWord));
         }
         page_.writeLine(line, 0, 1, 0);
+        page_.countLine();
+    }
+    if (isOpen) {
+        page_.lineFeed(1);
         page_.countLine();
     }
     UpdateAllViews(nullptr, 0, nullptr);

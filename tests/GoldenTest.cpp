@@ -45,11 +45,14 @@ TEST(Golden, EveryExampleComesOutByteForByte)
         kareport::JobRunner runner(job, source, progress);
         const auto error = runner.run();
         ASSERT_FALSE(error) << qPrintable(error->message());
-        for (const auto &[kind, ending] : {std::pair(kareport::OutputKind::Report, QStringLiteral(".rep")),
-                                           std::pair(kareport::OutputKind::Text, QStringLiteral(".txt"))})
-        {
-            const QString file = name.chopped(5) + ending;
-            ASSERT_FALSE(kareport::writeOutput(runner.report(), {folder.filePath(file), kind})) << qPrintable(file);
+        using kareport::OutputKind;
+        const std::pair<OutputKind, const char *> outputs[] = {
+            {OutputKind::Report, ".rep"}, {OutputKind::Text, ".txt"}, {OutputKind::RichText, ".rtf"}};
+        for (const auto &[kind, ending] : outputs) {
+            const QString file = name.chopped(5) + QString::fromLatin1(ending);
+            QStringList warnings;
+            ASSERT_FALSE(kareport::writeOutput(runner.report(), {folder.filePath(file), kind}, progress, warnings))
+                << qPrintable(file);
             const QByteArray expected = contentOf(goldens.filePath(file));
             const QByteArray made = contentOf(folder.filePath(file));
             EXPECT_TRUE(made == expected)

@@ -14,6 +14,9 @@ namespace
 using kareport::PdfNotes;
 using kareport::PdfOptions;
 
+/// The points that a character of 9 points takes.
+constexpr double characterWidth = 5.418;
+
 TEST(PdfExportText, LinesStandOnTheirPages)
 {
     struct Row
@@ -28,7 +31,6 @@ TEST(PdfExportText, LinesStandOnTheirPages)
     const Row rows[] = {
         {QStringLiteral("A\r\n"), 1, {QStringLiteral("A")}, "one line"},
         {QStringLiteral("A"), 1, {QStringLiteral("A")}, "without its end"},
-        {QStringLiteral("A\r\n\r\n\r\nB\r\n"), 4, {QStringLiteral("A\n\n\nB")}, "empty lines"},
         {sixty, 60, {full("last of 60")}, "the last line of a full page is there"},
         {sixty + QStringLiteral("61st\r\n"), 61, {full("last of 60"), QStringLiteral("61st")}, "one line more"},
         {sixty + sixty, 120, {full("last of 60"), full("last of 60")}, "two full pages"},
@@ -45,7 +47,7 @@ TEST(PdfExportText, LinesStandOnTheirPages)
     };
     for (const Row &row : rows) {
         const PdfReadBack pdf(pdfBytes(row.text, pdfOptions(row.lineCount)));
-        EXPECT_EQ(pdf.pages(), row.expected) << row.reason;
+        EXPECT_EQ(pdf.columns(characterWidth), row.expected) << row.reason;
         EXPECT_EQ(pdf.pageCount(), row.expected.size()) << row.reason;
         EXPECT_EQ(pdf.check(), QString()) << row.reason;
     }
@@ -69,14 +71,15 @@ TEST(PdfExportText, IsWhatIsSeenOfTheReport)
     };
     constexpr Row rows[] = {
         {u"(a) \\ <b> [c] {d} %e /f", u"(a) \\ <b> [c] {d} %e /f", "what has a meaning in a PDF"},
-        {u"0\t1\t12345678\t2", u"0       1       12345678        2", "tabs lead to every eighth column"},
         {u"a\rb", u"ab", "a lone CR ends nothing and draws nothing"},
         {u"a\fb", u"ab", "a form feed begins no page"},
         {QStringView(u"a\0b", 3), u"ab", "a zero ends nothing"},
         {u"a\u2028b\u2029c", u"abc", "separators end nothing"},
         {u"é°ßÄ½", u"é°ßÄ½", "Latin-1"},
-        {u"\u0129\u0A28\u5C28\u295C\u0D5C", u"\u0129\u0A28\u5C28\u295C\u0D5C",
-         "codes whose bytes are brackets, a backslash, a line end"},
+        {u"\u0128\u0129\u015C\u010D\u010A", u"\u0128\u0129\u015C\u010D\u010A",
+         "codes whose lower bytes are brackets, a backslash, line ends"},
+        {u"\u2987\u2988\u29EB", u"\u2987\u2988\u29EB", "the higher byte as well"},
+        {u"\u5C28\u5C0D\u5C5C", u"\u5C28\u5C0D\u5C5C", "the higher byte as well, in a collection's face"},
         {u"∞ ≤ Ω", u"∞ ≤ Ω", "signs"},
         {u"測量 é ∞", u"測量 é ∞", "CJK among others"},
         {u"a\xD83Dz", u"a\uFFFDz", "half a pair"},
@@ -92,9 +95,17 @@ TEST(PdfExportText, IsWhatIsSeenOfTheReport)
     }
 }
 
+TEST(PdfExportText, TabsLeadToEveryEighthColumn)
+{
+    const PdfReadBack pdf(pdfBytes(QStringLiteral("0\t1\t12345678\t2\r\n1234567\t8\r\n\tx  y\r\n")));
+    EXPECT_EQ(pdf.columns(characterWidth), QStringList{QStringLiteral("0       1       12345678        2\n"
+                                                                      "1234567 8\n"
+                                                                      "        x  y")});
+}
+
 TEST(PdfExportText, AWideLineGoesOnBelow)
 {
-    // 5.418 points a character, 523.32 points of room: 96 characters.
+    // There are 523.32 points of room: 96 characters.
     const std::u16string x96(96, u'x');
     struct Row
     {
@@ -111,14 +122,49 @@ TEST(PdfExportText, AWideLineGoesOnBelow)
         {u"ab " + x96, u"ab\n" + x96, "a word that does not fit goes below"},
         {u"ab " + x96 + u"y", u"ab\n" + x96 + u"\ny", "also one that is broken there"},
         {x96 + std::u16string(40, u' '), x96, "blanks beyond the edge need no line"},
-        {std::u16string(200, u' '), u"", "blanks alone"},
-        {u"\t\t\t\t\t\t\t\t\t\t\t\tx", u"\nx", "tabs up to the edge"},
     };
     for (const Row &row : rows) {
         const std::u16string text = row.line + u"\r\nnext\r\n";
         const PdfReadBack pdf(pdfBytes(QStringView(text), pdfOptions(2)));
-        EXPECT_EQ(pdf.pages(), QStringList{QString::fromStdU16String(row.expected + u"\nnext")}) << row.reason;
+        EXPECT_EQ(pdf.columns(characterWidth), QStringList{QString::fromStdU16String(row.expected + u"\nnext")})
+            << row.reason;
     }
+}
+
+TEST(PdfExportText, EmptyLinesTakeTheirRoom)
+{
+    struct Row
+    {
+        QStringView between;
+        int lines;
+        const char *reason;
+    };
+    const QString blanks(200, u' ');
+    const QString tabs = QString(12, u'\t') + u'x';
+    const Row rows[] = {
+        {u"", 1, "none"},
+        {u"\r\n", 2, "one"},
+        {u"\n\n\n", 4, "some"},
+        {u"\f\r\n", 2, "a form feed is not seen"},
+        {u"\r\r\r\n", 2, "CRs end nothing"},
+        {u" \r\n", 2, "a blank"},
+        {u"\t\r\n", 2, "a tab"},
+    };
+    for (const Row &row : rows) {
+        const QString text = QStringLiteral("A\r\n") + row.between.toString() + QStringLiteral("B\r\nC\r\n");
+        const std::vector<PdfWord> words = PdfReadBack(pdfBytes(text)).words();
+        ASSERT_EQ(words.size(), 3U) << row.reason;
+        EXPECT_NEAR(words[1].top - words[0].top, row.lines * (words[2].top - words[1].top), 0.01) << row.reason;
+    }
+    const std::vector<PdfWord> words =
+        PdfReadBack(pdfBytes(QString(QStringLiteral("A\r\n") + blanks + QStringLiteral("\r\nB\r\n") + tabs +
+                                     QStringLiteral("\r\nC\r\n"))))
+            .words();
+    ASSERT_EQ(words.size(), 4U);
+    const double step = (words[1].top - words[0].top) / 2;
+    EXPECT_NEAR(words[2].top - words[1].top, 2 * step, 0.01) << "tabs up to the edge, the word below it";
+    EXPECT_NEAR(words[3].top - words[2].top, step, 0.01);
+    EXPECT_NEAR(words[2].left, 36, 0.01);
 }
 
 TEST(PdfExportText, AFullPageOfBrokenLinesLosesNone)
@@ -144,14 +190,29 @@ TEST(PdfExportText, APageMayHoldMoreThanALibraryCallTakes)
     while (words.size() < 70000) {
         words += QString::number(words.size()) + u' ';
     }
-    const QString word(70000, u'x');
-    const QString wide = QStringLiteral("測").repeated(23000);
-    for (const QString &text : {words, word, wide}) {
-        PdfOptions options = pdfOptions(1);
-        const PdfReadBack pdf(pdfBytes(QString(text + QStringLiteral("\r\nend\r\n")), options));
-        EXPECT_EQ(pdf.pageCount(), 1);
-        EXPECT_EQ(pdf.characters(), QString(text).remove(u' ') + QStringLiteral("end"));
-        EXPECT_EQ(pdf.check(), QString());
+    struct Row
+    {
+        QString text;
+        unsigned fontSize;
+        const char *reason;
+    };
+    const Row rows[] = {
+        {words, 9, "words"},
+        {QString(70000, u'x'), 9, "a word"},
+        {QStringLiteral("測").repeated(23000), 9, "characters of three bytes"},
+        {QString(23000, u'x'), 1, "a single line that is longer than what is handed on at once"},
+    };
+    for (const Row &row : rows) {
+        // A huge sheet: on a usual one the text gets so small that it is not read back.
+        PdfOptions options = pdfOptions(2);
+        options.page.pageSize = QSize(14000, 14000);
+        options.page.resolution = 72;
+        options.page.margins = QMargins();
+        options.page.fontSize = row.fontSize;
+        const PdfReadBack pdf(pdfBytes(QString(row.text + QStringLiteral("\r\nend\r\n")), options));
+        EXPECT_EQ(pdf.pageCount(), 1) << row.reason;
+        EXPECT_TRUE(pdf.characters() == QString(row.text).remove(u' ') + QStringLiteral("end")) << row.reason;
+        EXPECT_EQ(pdf.check(), QString()) << row.reason;
     }
 }
 

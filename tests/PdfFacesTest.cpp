@@ -34,7 +34,7 @@ TEST(PdfFaces, KnowWhatTheyCover)
         {U'é', true, true, "Latin-1"},
         {U'∞', true, true, "a sign"},
         {U'測', false, true, "CJK"},
-        {U'⠿', true, false, "Braille"},
+        {U'⧫', true, false, "a lozenge"},
         {U'😀', false, false, "beyond U+FFFF"},
         {U'\U0001D538', false, false, "beyond U+FFFF, although the face has it"},
         {0x110000, false, false, "no character"},
@@ -155,8 +155,8 @@ TEST(PdfFaces, TheFirstThatShowsMostIsTaken)
         {{}, {deja, wqy}, U"Aé", u"DejaVuSansMono", "both have all: the first"},
         {{}, {wqy, deja}, U"Aé", u"wqy-zenhei", "both have all: the first"},
         {{}, {deja, wqy}, U"A測", u"wqy-zenhei", "the one that has all"},
-        {{}, {deja, wqy}, U"A⠿測量", u"wqy-zenhei DejaVuSansMono", "the second has what the first lacks"},
-        {{}, {deja, wqy}, U"A⠿⠾測", u"DejaVuSansMono wqy-zenhei", "the one that has most stands first"},
+        {{}, {deja, wqy}, U"A⧫測量", u"wqy-zenhei DejaVuSansMono", "the second has what the first lacks"},
+        {{}, {deja, wqy}, U"A⧫⦇測", u"DejaVuSansMono wqy-zenhei", "the one that has most stands first"},
         {{}, {deja, wqy}, U"A😀", u"DejaVuSansMono", "what nobody has calls for nobody"},
         {{}, {deja, wqy}, U"😀", u"DejaVuSansMono", "what nobody has still needs a face for its sign"},
         {deja, {deja, wqy}, U"A", u"DejaVuSansMono", "the preferred one has all"},
@@ -170,7 +170,7 @@ TEST(PdfFaces, TheFirstThatShowsMostIsTaken)
         EXPECT_EQ(filesOf(choosePdfFaces(row.preferred, row.others, countsOf(row.characters))), row.expected)
             << row.reason;
     }
-    EXPECT_EQ(filesOf(choosePdfFaces({}, {deja, wqy}, {{U'⠿', 1}, {U'測', 2}})), u"wqy-zenhei DejaVuSansMono")
+    EXPECT_EQ(filesOf(choosePdfFaces({}, {deja, wqy}, {{U'⧫', 1}, {U'測', 2}})), u"wqy-zenhei DejaVuSansMono")
         << "occurrences count, not characters";
 }
 

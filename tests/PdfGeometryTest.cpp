@@ -65,7 +65,7 @@ PdfPageSetup setupOf(unsigned fontSize, int linesPerPage)
 
 TEST(PdfGeometry, LinesStandAsFarApartAsTheyAreHighOrAsTheyMustToFit)
 {
-    constexpr float closest = 700 / 70.2F;
+    constexpr float closest = 700 / 93.6F;
     constexpr float broken = 700 / 1404.F;
     struct Row
     {
@@ -81,8 +81,8 @@ TEST(PdfGeometry, LinesStandAsFarApartAsTheyAreHighOrAsTheyMustToFit)
         {10, 60, 60, {10, 688 / 59.F, 742}, "59 steps in what the first line leaves"},
         {10, 60, 1, {10, 688 / 59.F, 742}, "a page that is not full looks like the others"},
         {10, 60, 0, {10, 688 / 59.F, 742}, "an empty page"},
-        {10, 69, 69, {10, 688 / 68.F, 742}, "the closest at which they do not touch"},
-        {10, 70, 70, {closest, closest, 750 - 0.8F * closest}, "they would touch: the font gives way"},
+        {10, 92, 92, {10, 688 / 91.F, 742}, "the closest at which they do not run into each other"},
+        {10, 93, 93, {closest / 0.75F, closest, 750 - 0.8F / 0.75F * closest}, "they would: the font gives way"},
         {10, 50, 58, {10, 12, 742}, "broken lines that find room"},
         {10, 50, 117, {10 * broken, 12 * broken, 750 - 8 * broken}, "broken lines that do not: all is smaller"},
         {10,
@@ -117,7 +117,8 @@ TEST(PdfGeometry, AllLinesStandInTheBox)
                                    << linesPerPage << " lines a page, " << fontSize << " points, " << lines << " lines";
                 EXPECT_LE(double(placement.firstBaseline) + ascent, double(box.top) + 0.01) << which;
                 EXPECT_GE(last + descent, double(box.bottom) - 0.01) << which;
-                EXPECT_GE(double(placement.leading), double(placement.fontSize) * 0.999) << which << ": lines touch";
+                EXPECT_GE(double(placement.leading), double(placement.fontSize) * 0.749)
+                    << which << ": lines run into each other";
                 EXPECT_LE(placement.fontSize, float(fontSize)) << which;
             }
         }
@@ -151,8 +152,8 @@ TEST(PdfGeometry, APageHasRoomForItsLinesOrForThoseOfAShortReport)
         {60, 60, 60, "a full page"},
         {60, 1, 60, "a short report stands as a long one does"},
         {60, 100000, 60, "a long report"},
-        {69, 1, 69, "close, but not touching"},
-        {70, 1, 1, "a page that is too long for its font: the report's lines are what has to fit"},
+        {92, 1, 92, "close, but not running into each other"},
+        {93, 1, 1, "a page that is too long for its font: the report's lines are what has to fit"},
         {32000, 25, 25, "no pages are meant"},
         {32000, 0, 1, "no pages are meant, and nothing is written"},
         {32000, 100000, 32000, "more lines than even such a page has"},

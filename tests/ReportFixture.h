@@ -17,6 +17,7 @@
 #include "UView.h"
 
 #include <QDateTime>
+#include <QIODevice>
 #include <QString>
 
 #include <memory>

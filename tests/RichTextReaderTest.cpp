@@ -122,6 +122,7 @@ TEST(RichTextReader, ReadsTablesAsLinesWithTabs)
         {"A\\par B\\cell C\\cell\\row", u"A|B\tC", "two paragraphs in a cell"},
         {"A\\cell x\\nestcell y\\nestcell{\\*\\nesttableprops\\trowd\\cellx1\\nestrow}{\\nonesttables\\par}\\cell\\row z",
          u"A\tx\ty|z", "a table in a table"},
+        {"A\\cell\\par B\\cell\\row", u"A\t|B", "a cell that begins with an empty paragraph"},
         {"A\\cell B", u"A\tB", "cut off in a row"},
     };
     expectBodies(rows);

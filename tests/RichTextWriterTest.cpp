@@ -125,6 +125,16 @@ TEST(RichTextWriter, TablesBecomeParagraphsAndPicturesAreLeftOut)
     EXPECT_TRUE(text.contains(QStringLiteral(">B|"))) << text.toStdString();
 }
 
+TEST(RichTextWriter, LongTextsAreWrittenInPiecesWithoutASeam)
+{
+    constexpr qsizetype piece = 65536;
+    for (qsizetype at = piece - 2; at <= piece + 1; ++at) {
+        const QByteArray bytes = writtenText(QString(at, u'a') + QStringLiteral("😀") + QString(piece, u'b'));
+        EXPECT_TRUE(bytes.contains("aaa\\u-10179?\\u-8704?bbb")) << at;
+        EXPECT_EQ(bytes.count('b'), piece) << at;
+    }
+}
+
 TEST(RichTextWriter, LinesStayShortAndFollowTheParagraphs)
 {
     QString text;

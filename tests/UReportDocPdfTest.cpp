@@ -9,6 +9,7 @@
 #include <gtest/gtest.h>
 
 #include <functional>
+#include <vector>
 
 namespace
 {
@@ -139,6 +140,25 @@ TEST(UReportDocPdf, WithoutAMeasuredPageThereIsNone)
     EXPECT_FALSE(report.WritePdf(file, &notes));
     EXPECT_EQ(file.data().size(), 0);
     EXPECT_FALSE(notes.problem.isEmpty()) << "and it says why";
+}
+
+TEST(UReportDocPdf, TheProgressIsToldAndCanStopIt)
+{
+    const FixedSurroundings surroundings;
+    PrintedReport report;
+    report.FixPage(1, 80);
+    for (const bool goesOn : {true, false}) {
+        QBuffer file;
+        file.open(QIODevice::WriteOnly);
+        std::vector<qint64> pages;
+        EXPECT_EQ(report.WritePdf(file, nullptr,
+                                  [&](qint64 done, qint64) {
+                                      pages.push_back(done);
+                                      return goesOn;
+                                  }),
+                  goesOn);
+        EXPECT_EQ(pages, goesOn ? (std::vector<qint64>{1, 2}) : std::vector<qint64>{1});
+    }
 }
 
 TEST(UReportDocPdf, WhatIsMissingIsTold)

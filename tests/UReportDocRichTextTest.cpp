@@ -7,8 +7,8 @@
 namespace
 {
 
-const QString head = QStringLiteral(
-    "{\\rtf1\\ansi\\ansicpg1252\\deff0\\deflang1033{\\fonttbl{\\f9\\fnil\\fcharset0 Lucida Console;}}");
+const QString head =
+    QStringLiteral("{\\rtf1\\ansi\\ansicpg1252\\deff0\\deflang1033{\\fonttbl{\\f9\\fnil\\fcharset0 Lucida Console;}}");
 
 /// A report of 9 points in rich-text mode.
 class RichReport : public UReportDoc
@@ -203,7 +203,8 @@ TEST(UReportDocRichText, TheFontTableNamesTheFontThatTheFragmentsDoNotChoose)
         {QStringLiteral("Courier New"), 12, QStringLiteral("{\\fonttbl{\\f12\\fnil\\fcharset0 Courier New;}}"),
          "the font's number is its size"},
         {QString(), 0, QStringLiteral("{\\fonttbl{\\f0\\fnil\\fcharset0 ;}}"), "no name and no size"},
-        {QStringLiteral(u"\u6E2C;}"), 4294967295U, QStringLiteral(u"{\\fonttbl{\\f4294967295\\fnil\\fcharset0 \u6E2C;};}}"),
+        {QStringLiteral(u"\u6E2C;}"), 4294967295U,
+         QStringLiteral(u"{\\fonttbl{\\f4294967295\\fnil\\fcharset0 \u6E2C;};}}"),
          "a name goes in as it is, and no size is negative"},
     };
     for (const Row &row : rows) {

@@ -3,10 +3,12 @@
 
 #include "SaveDialog.h"
 
+#include <QCoreApplication>
 #include <QCursor>
 #include <QDir>
 #include <QGuiApplication>
 #include <QTemporaryDir>
+#include <QTranslator>
 
 #include <gtest/gtest.h>
 
@@ -17,15 +19,14 @@ namespace
 {
 
 const QString folderEntry = QStringLiteral("LastOpenDirectoryReport");
-const QString reportsFirst = QStringLiteral(
-    "Report Files (*.rep)|*.rep|RTF Files (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|All Files (*.*)|*.*||");
-const QString richTextFirst = QStringLiteral(
-    "RTF Files (*.rtf)|*.rtf|Report Files (*.rep)|*.rep|PDF (*.pdf)|*.pdf|All Files (*.*)|*.*||");
+const QString reportsFirst =
+    QStringLiteral("Report Files (*.rep)|*.rep|RTF Files (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|All Files (*.*)|*.*||");
+const QString richTextFirst =
+    QStringLiteral("RTF Files (*.rtf)|*.rtf|Report Files (*.rep)|*.rep|PDF (*.pdf)|*.pdf|All Files (*.*)|*.*||");
 
 bool isWaiting()
 {
-    return QGuiApplication::overrideCursor() != nullptr &&
-           QGuiApplication::overrideCursor()->shape() == Qt::WaitCursor;
+    return QGuiApplication::overrideCursor() != nullptr && QGuiApplication::overrideCursor()->shape() == Qt::WaitCursor;
 }
 
 /// A save dialog that answers at once.
@@ -140,7 +141,8 @@ TEST(UReportDocSaveDialog, OffersRichTextFirstAfterAFileOfThatName)
         cleared.OnOpenDocument(path);
         cleared.Clear();
         cleared.DoSave(QString(), false);
-        EXPECT_EQ(dialog.requests.back().filter, reportsFirst) << row.reason << ": an emptied report comes from no file";
+        EXPECT_EQ(dialog.requests.back().filter, reportsFirst)
+            << row.reason << ": an emptied report comes from no file";
 
         UReportDoc reopened;
         reopened.OnOpenDocument(path);
@@ -148,6 +150,31 @@ TEST(UReportDocSaveDialog, OffersRichTextFirstAfterAFileOfThatName)
         reopened.DoSave(QString(), false);
         EXPECT_EQ(dialog.requests.back().filter, reportsFirst) << row.reason << ": the file asked for last counts";
     }
+}
+
+/// Knows the file kinds in another language.
+class Translator : public QTranslator
+{
+public:
+    Translator() { QCoreApplication::installTranslator(this); }
+    ~Translator() override { QCoreApplication::removeTranslator(this); }
+
+    bool isEmpty() const override { return false; }
+    QString translate(const char * /*context*/, const char *text, const char * /*note*/, int /*number*/) const override
+    {
+        const QString kinds = QString::fromUtf8(text);
+        return kinds.startsWith(QStringLiteral("Report Files")) ? QStringLiteral("Berichte|*.rep|") : QString();
+    }
+};
+
+TEST(UReportDocSaveDialog, TheKindsAreTranslated)
+{
+    const FixedSurroundings surroundings;
+    const Translator translator;
+    const AnsweredDialog dialog(std::nullopt);
+    UReportDoc report;
+    report.DoSave(QString(), false);
+    EXPECT_EQ(dialog.requests.back().filter, QStringLiteral("Berichte|*.rep|All Files (*.*)|*.*||"));
 }
 
 TEST(UReportDocSaveDialog, ANameThatBeginsWithTheExtensionIsNoRichText)

@@ -15,7 +15,9 @@ class TemporaryFolder
 {
 public:
     explicit TemporaryFolder(const QString &suffix = QString())
-        : unix_(qgetenv("TMPDIR")), windows_(qgetenv("TMP")), isUnixSet_(qEnvironmentVariableIsSet("TMPDIR")),
+        : unix_(qgetenv("TMPDIR")),
+          windows_(qgetenv("TMP")),
+          isUnixSet_(qEnvironmentVariableIsSet("TMPDIR")),
           isWindowsSet_(qEnvironmentVariableIsSet("TMP"))
     {
         set(folder_.path() + suffix);
@@ -140,8 +142,8 @@ TEST(UReportDocTemporaryName, TheFolderEndsWithOneSeparator)
     const TemporaryFolder folder(QStringLiteral("/"));
     EXPECT_EQ(nameFor(QStringLiteral("Survey")), folder.at(QStringLiteral("Survey.rep"))) << "given with one";
     TemporaryFolder::set(QStringLiteral("/"));
-    EXPECT_EQ(nameFor(QStringLiteral("Survey of the root")), QStringLiteral("/Survey of the root.rep"))
-        << "the separator is all of it";
+    const QString unused = QDir(folder.at(QString())).dirName();
+    EXPECT_EQ(nameFor(unused), QDir::separator() + unused + QStringLiteral(".rep")) << "the separator is all of it";
 }
 
 TEST(UReportDocTemporaryName, AfterAThousandTheLastOneIsGivenAgain)

@@ -1,0 +1,71 @@
+// Does one piece of work on files and says how long it took, for comparisons with other programs.
+//
+//   ka_file_work save TEXT OUT    TEXT (UTF-16LE) is put into a report; the time of saving it as OUT
+//   ka_file_work load IN          the time of loading a report file
+//   ka_file_work pdf IN OUT       IN is loaded; the time of writing it as a PDF, 72 lines a page
+//
+// Prints the seconds and the peak memory of the process in KB.
+
+#include "PosixProcessorTime.h"
+#include "Profile.h"
+#include "ReplaceFile.h"
+#include "UReportDoc.h"
+
+#include <QElapsedTimer>
+#include <QFile>
+
+#include <cstdio>
+#include <functional>
+
+namespace
+{
+
+int say(const std::function<bool()> &work)
+{
+    QElapsedTimer timer;
+    timer.start();
+    const bool done = work();
+    const double seconds = double(timer.nsecsElapsed()) * 1e-9;
+    std::printf("%.6f %ld\n", seconds, peakMemory());
+    return done ? 0 : 1;
+}
+
+QByteArray contentOf(const char *path)
+{
+    QFile file(QFile::decodeName(path));
+    return file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
+}
+
+} // namespace
+
+int main(int argc, char **argv)
+{
+    kareport::setProfileStore(kareport::makeMemoryProfile());
+    const QByteArrayView verb(argc > 1 ? argv[1] : "");
+    UReportDoc report;
+    if (verb == QByteArrayView("save") && argc == 4) {
+        const QByteArray bytes = contentOf(argv[2]);
+        report.SetData(QString(reinterpret_cast<const QChar *>(bytes.constData()), bytes.size() / 2));
+        return say([&] { return report.OnSaveDocument(QFile::decodeName(argv[3])); });
+    }
+    if (verb == QByteArrayView("load") && argc == 3) {
+        return say([&] { return report.LoadFile(QFile::decodeName(argv[2]), true) == 1; });
+    }
+    if (verb == QByteArrayView("pdf") && argc == 4) {
+        report.FixPage(72, 80);
+        report.SetPageSize();
+        // Line by line, as a host writes it.
+        QFile file(QFile::decodeName(argv[2]));
+        file.open(QIODevice::ReadOnly);
+        file.skip(3);
+        while (!file.atEnd()) {
+            report.WriteLine(QString::fromUtf8(file.readLine().trimmed()), 0, 1, 0);
+        }
+        return say([&] {
+            return kareport::replaceFile(QFile::decodeName(argv[3]),
+                                         [&](QIODevice &device) { return report.WritePdf(device); });
+        });
+    }
+    std::fputs("ka_file_work save TEXT OUT | load IN | pdf IN OUT\n", stderr);
+    return 1;
+}

@@ -1,0 +1,97 @@
+#include "CommandLine.h"
+#include "PdfReadBack.h"
+
+#include <QFile>
+
+#include <gtest/gtest.h>
+
+namespace
+{
+
+QByteArray styledJob(const QByteArray &lines)
+{
+    return R"({"header": false, "page": {"linesPerPage": 60, "charsPerRow": 80}, "report": [)" + lines + "]}";
+}
+
+TEST(CommandLineKinds, TheRichTextImageHasTheStylesOfItsLines)
+{
+    const CommandLineFolder folder;
+    folder.put("s.json", styledJob(R"({"line": "ABC"}, {"line": "X", "style": 1}, {"line": "\u221e{", "after": 0})"));
+    const QByteArray image =
+        "{\\rtf1\\ansi\\ansicpg1252\\deff0\\deflang1033{\\fonttbl{\\f8\\fnil\\fcharset0 Lucida Console;}}"
+        "\\viewkind4\\uc1\\pard\\f1\\fs18 ABC \\par\\viewkind4\\uc1\\pard\\b\\f1\\fs18 X\\b0 \\par"
+        "\\viewkind4\\uc1\\pard\\f1\\fs18 \\u8734?{ }";
+    struct Row
+    {
+        const char *line;
+        const char *reason;
+    };
+    const Row rows[] = {
+        {"render s.json -o i.dat --as rtf-image", "a name that says no kind"},
+        {"render s.json -o i.dat -o r.rtf -o r.rep --as rtf-image", "beside other kinds"},
+    };
+    for (const Row &row : rows) {
+        const ProgramRun run = folder.run(row.line);
+        EXPECT_EQ(run.status, 0) << run.all().constData();
+        EXPECT_EQ(folder.bytesOf("i.dat").toStdString(), image.toStdString()) << row.reason;
+    }
+    EXPECT_EQ(folder.bytesOf("r.rtf").toStdString(), image.toStdString())
+        << "\".rtf\" is rich text of either kind, and the option says of which";
+    ASSERT_EQ(folder.run("render s.json -o r.rtf").status, 0);
+    EXPECT_TRUE(folder.bytesOf("r.rtf").startsWith("{\\rtf1"));
+    EXPECT_FALSE(folder.bytesOf("r.rtf").contains("viewkind")) << "without it, as the view saves it";
+}
+
+TEST(CommandLineKinds, RichTextDoesNotHangOnAnotherOutput)
+{
+    const CommandLineFolder folder;
+    folder.put("one.json", styledJob(R"({"line": "X", "style": 1}], "output": ["a.rtf")"));
+    folder.put("two.json",
+               styledJob(R"({"line": "X", "style": 1}], "output": [{"file": "i.rtf", "as": "rtf-image"}, "b.rtf")"));
+    ASSERT_EQ(folder.run("render one.json").status, 0);
+    ASSERT_EQ(folder.run("render two.json").status, 0);
+    EXPECT_EQ(folder.bytesOf("a.rtf").toStdString(), folder.bytesOf("b.rtf").toStdString());
+    EXPECT_TRUE(folder.bytesOf("i.rtf").contains("\\b0"));
+}
+
+TEST(CommandLineKinds, ACharacterThatNoFontHasIsSaid)
+{
+    const CommandLineFolder folder;
+    folder.put("e.json", styledJob(R"({"line": "a"}, {"line": "b \ud83d\ude00"}, {"line": "\ud83d\ude00"})"));
+    const ProgramRun run = folder.run("render e.json -o e.pdf");
+    EXPECT_EQ(run.status, 0) << run.all().constData();
+    EXPECT_EQ(run.err.toStdString(), "kareport: warning: \"e.pdf\": no font has the character \"\xF0\x9F\x98\x80\" "
+                                     "(U+1F600), first in line 2, 2 times in all\n");
+    EXPECT_EQ(folder.run("render e.json -o e.pdf --quiet").err, "");
+}
+
+TEST(CommandLineKinds, APdfGoesToStandardOutputAsWell)
+{
+    const CommandLineFolder folder;
+    folder.put("s.json", styledJob(R"({"line": "on paper"})"));
+    ASSERT_EQ(folder.run("render s.json -o s.pdf").status, 0);
+    const ProgramRun run = folder.run("render s.json -o - --as pdf");
+    EXPECT_EQ(run.status, 0);
+    EXPECT_TRUE(run.out == folder.bytesOf("s.pdf"));
+    EXPECT_EQ(PdfReadBack(run.out).pages(), QStringList(QStringLiteral("on paper")));
+}
+
+TEST(CommandLineKinds, AFontFileThatIsNoneLeavesTheEarlierFile)
+{
+    const CommandLineFolder folder;
+    folder.put("s.json", styledJob(R"({"line": "x"})"));
+    folder.put("s.pdf", "kept");
+    folder.put("fonts.conf", "<?xml version=\"1.0\"?><!DOCTYPE fontconfig SYSTEM \"fonts.dtd\"><fontconfig><dir>" +
+                                 folder.path("").toUtf8() + "</dir></fontconfig>");
+    const std::pair<const char *, const char *> fonts = {"FONTCONFIG_FILE", "fonts.conf"};
+    const ProgramRun none = runProgram(folder.path(""), words("render s.json -o s.pdf"), {fonts});
+    EXPECT_EQ(none.status, 3);
+    EXPECT_TRUE(none.err.contains("no fixed-pitch font was found")) << none.all().constData();
+    folder.put("lucon.TTF", "this is no font");
+    const ProgramRun broken = runProgram(folder.path(""), words("render s.json -o s.pdf"), {fonts});
+    EXPECT_EQ(broken.status, 3);
+    EXPECT_TRUE(broken.err.contains("lucon.TTF\" cannot be used")) << broken.all().constData();
+    EXPECT_EQ(folder.bytesOf("s.pdf"), "kept");
+}
+
+} // namespace
