@@ -83,7 +83,8 @@ TEST(CommandLineKinds, AFontFileThatIsNoneLeavesTheEarlierFile)
     folder.put("s.pdf", "kept");
     folder.put("fonts.conf", "<?xml version=\"1.0\"?><!DOCTYPE fontconfig SYSTEM \"fonts.dtd\"><fontconfig><dir>" +
                                  folder.path("").toUtf8() + "</dir></fontconfig>");
-    const std::pair<const char *, const char *> fonts = {"FONTCONFIG_FILE", "fonts.conf"};
+    const QByteArray configuration = folder.path("fonts.conf").toUtf8();
+    const std::pair<const char *, const char *> fonts = {"FONTCONFIG_FILE", configuration.constData()};
     const ProgramRun none = runProgram(folder.path(""), words("render s.json -o s.pdf"), {fonts});
     EXPECT_EQ(none.status, 3);
     EXPECT_TRUE(none.err.contains("no fixed-pitch font was found")) << none.all().constData();

@@ -101,16 +101,18 @@ TEST(UReportDocLoadLongLines, ALineOfRichTextStaysInOnePiece)
         const char *reason;
     };
     const Row rows[] = {
-        {"{\\rtf1 " + words + "}", QStringLiteral("{\\rtf1 ") + long_ + u'}', "all in one line"},
+        {"{\\rtf1 " + words + "}", QStringLiteral("{\\rtf1 ") + long_ + QStringLiteral("}\r\n"),
+         "all in one line, ended as every last line"},
         {"{\\rtf1 " + words + "}\n", QStringLiteral("{\\rtf1 ") + long_ + QStringLiteral("}\n\r\n"), "with a line end"},
         {"{\\rtf1\r\n" + words + "\r\n" + words + "\r\n}",
-         QStringLiteral("{\\rtf1\n\r\n") + long_ + QStringLiteral("\n\r\n") + long_ + QStringLiteral("\n\r\n}"),
+         QStringLiteral("{\\rtf1\n\r\n") + long_ + QStringLiteral("\n\r\n") + long_ + QStringLiteral("\n\r\n}\r\n"),
          "long lines behind the first"},
-        {" \t{\\rtf1 " + words + "}", QStringLiteral(" \t{\\rtf1 ") + long_ + u'}', "white space in front"},
+        {" \t{\\rtf1 " + words + "}", QStringLiteral(" \t{\\rtf1 ") + long_ + QStringLiteral("}\r\n"),
+         "white space in front"},
         {"{\\rtf1 " + QByteArray(1015, 'x') + "\n}",
-         QStringLiteral("{\\rtf1 ") + QString(1015, u'x') + QStringLiteral("\n\r\n}"),
+         QStringLiteral("{\\rtf1 ") + QString(1015, u'x') + QStringLiteral("\n\r\n}\r\n"),
          "the line end alone in the second piece"},
-        {"{\\rtf1 short\n}", QStringLiteral("{\\rtf1 short\n\r\n}"), "short lines as ever"},
+        {"{\\rtf1 short\n}", QStringLiteral("{\\rtf1 short\n\r\n}\r\n"), "short lines as ever"},
     };
     for (const Row &row : rows) {
         const FixedSurroundings surroundings;
@@ -127,7 +129,7 @@ TEST(UReportDocLoadLongLines, ALongFirstLineOfRichTextKeepsAllOfItsPieces)
     const FixedSurroundings surroundings;
     const QByteArray first = "{\\rtf1 " + QByteArray(1500, 'x') + "\\b TALVEN - N";
     EXPECT_TRUE(loadedRichText(first + "\r\n}", QStringLiteral("a.rtf")) ==
-                QString::fromLatin1(first) + QStringLiteral("\n\r\n}"));
+                QString::fromLatin1(first) + QStringLiteral("\n\r\n}\r\n"));
 }
 
 } // namespace
