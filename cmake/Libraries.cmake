@@ -24,7 +24,7 @@ function(ka_shared_library target)
 endfunction()
 
 ka_shared_library(KaReportHost ${KA_HOST_LAYERS})
-target_link_libraries(KaReportHost PUBLIC Qt6::Core)
+target_link_libraries(KaReportHost PUBLIC Qt6::Core Qt6::Widgets)
 
 ka_shared_library(KaReport ${KA_MODULE_LAYERS})
 target_link_libraries(KaReport PUBLIC KaReportHost Qt6::Gui PRIVATE Qt6::PrintSupport Fontconfig::Fontconfig Freetype::Freetype ${HPDF_LIBRARY})

@@ -72,6 +72,8 @@ void CViewPane::ShowPane(bool show)
     visible_ = show;
 }
 
+void CViewPane::BringToTop() {}
+
 bool CViewPane::CanClosePane()
 {
     UDocument *document = GetActiveDocument();

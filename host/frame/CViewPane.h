@@ -23,7 +23,7 @@ public:
     CViewPane &operator=(const CViewPane &) = delete;
 
     /// Takes a view into the pane, which owns it from then on.
-    void AddView(std::unique_ptr<UView> view);
+    virtual void AddView(std::unique_ptr<UView> view);
     const std::vector<std::unique_ptr<UView>> &GetViews() const { return views_; }
     /// Takes a view out of the pane and destroys it.
     void RemoveView(UView *view);
@@ -49,6 +49,8 @@ public:
 
     virtual bool IsVisible() const { return visible_; }
     virtual void ShowPane(bool show);
+    /// Brings the pane's window to the front.
+    virtual void BringToTop();
 
     /// Whether the pane may be closed; asks its document.
     virtual bool CanClosePane();

@@ -46,3 +46,17 @@ void UApplication::AddToRecentFileList(const QString &path)
         recentFiles_.removeLast();
     }
 }
+
+void UApplication::ForgetReport(const UDocument *report)
+{
+    if (currentReport_ == report) {
+        currentReport_ = nullptr;
+    }
+}
+
+void UApplication::ForgetView(const UView *view)
+{
+    if (companionView_ == view) {
+        companionView_ = nullptr;
+    }
+}

@@ -29,7 +29,18 @@ public:
     virtual void AddToRecentFileList(const QString &path);
     const QStringList &GetRecentFileList() const { return recentFiles_; }
 
+    /// The report that the user works with, and the view that goes with it; null without one.
+    UDocument *GetCurrentReport() const { return currentReport_; }
+    UView *GetCompanionView() const { return companionView_; }
+    void SetCurrentReport(UDocument *report) { currentReport_ = report; }
+    void SetCompanionView(UView *view) { companionView_ = view; }
+    /// Takes a document, or a view, that goes out of the pair.
+    void ForgetReport(const UDocument *report);
+    void ForgetView(const UView *view);
+
 private:
+    UDocument *currentReport_ = nullptr;
+    UView *companionView_ = nullptr;
     std::vector<std::unique_ptr<UDocTemplate>> templates_;
     QStringList recentFiles_;
 };

@@ -24,6 +24,9 @@ UDocument::~UDocument()
     if (docTemplate_ != nullptr) {
         docTemplate_->Forget(this);
     }
+    if (UApplication::Get() != nullptr) {
+        UApplication::Get()->ForgetReport(this);
+    }
 }
 
 void UDocument::SetTitle(const QString &title)

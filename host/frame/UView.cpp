@@ -1,12 +1,20 @@
 #include "UView.h"
 
 #include "CViewPane.h"
+#include "UApplication.h"
 #include "UDocument.h"
+#include "UXTPMDIFrameWnd.h"
 
 UView::UView() = default;
 
 UView::~UView()
 {
+    if (UXTPMDIFrameWnd::Get() != nullptr) {
+        UXTPMDIFrameWnd::Get()->ResetActiveViewForFrameAndPane(this);
+    }
+    if (UApplication::Get() != nullptr) {
+        UApplication::Get()->ForgetView(this);
+    }
     if (document_ != nullptr) {
         document_->RemoveView(this);
     }

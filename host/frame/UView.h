@@ -5,6 +5,7 @@
 #include <QtGlobal>
 
 class CViewPane;
+class QWidget;
 class UDocument;
 
 /// A view of a document, shown in a pane. The pane owns it.
@@ -22,6 +23,9 @@ public:
     UDocument *GetDocument() const { return document_; }
     /// The pane that shows the view; null for a view without one.
     CViewPane *GetParentPane() const { return pane_; }
+
+    /// The window that shows the view, owned by it; null for a view without one.
+    virtual QWidget *GetWidget() { return nullptr; }
 
     /// Called once when the view and its document are ready: updates the view.
     virtual void OnInitialUpdate();

@@ -1,0 +1,18 @@
+#pragma once
+
+#include "COneViewPane.h"
+#include "KaReportExport.h"
+
+/// A pane of the main frame with a body of its own instead of a view, which follows a document.
+class KAREPORT_EXPORT CPropertyPane : public COneViewPane
+{
+public:
+    CPropertyPane();
+    ~CPropertyPane() override;
+
+    /// Called when a document has changed.
+    virtual void OnUpdateProperties(UDocument *document);
+
+    /// Tells all open property panes that a document has changed.
+    static void UpdateAllPropertyPane(UDocument *document);
+};

@@ -1,0 +1,125 @@
+#include "UXTPMDIFrameWnd.h"
+
+#include "COneViewPane.h"
+#include "UView.h"
+
+#include <QAction>
+#include <QDockWidget>
+#include <QMenu>
+#include <QTimer>
+
+#include <utility>
+
+namespace
+{
+
+UXTPMDIFrameWnd *&theFrame()
+{
+    static UXTPMDIFrameWnd *frame = nullptr;
+    return frame;
+}
+
+/// How often the actions follow the state of what they act on.
+constexpr int updateInterval = 200; // milliseconds
+
+} // namespace
+
+UXTPMDIFrameWnd::UXTPMDIFrameWnd(QWidget *parent) : QMainWindow(parent)
+{
+    theFrame() = this;
+    setDockNestingEnabled(true);
+    setDockOptions(dockOptions() | QMainWindow::AllowTabbedDocks | QMainWindow::GroupedDragging);
+    setTabPosition(Qt::AllDockWidgetAreas, QTabWidget::North);
+    auto *timer = new QTimer(this);
+    connect(timer, &QTimer::timeout, this, &UXTPMDIFrameWnd::UpdateCommands);
+    timer->start(updateInterval);
+}
+
+UXTPMDIFrameWnd::~UXTPMDIFrameWnd()
+{
+    if (theFrame() == this) {
+        theFrame() = nullptr;
+    }
+}
+
+UXTPMDIFrameWnd *UXTPMDIFrameWnd::Get()
+{
+    return theFrame();
+}
+
+void UXTPMDIFrameWnd::SetActiveViewForFrameAndPane(UView *view)
+{
+    activeView_ = view;
+    UpdateCommands();
+}
+
+void UXTPMDIFrameWnd::ResetActiveViewForFrameAndPane(UView *view)
+{
+    if (activeView_ == view) {
+        activeView_ = nullptr;
+    }
+}
+
+QAction *UXTPMDIFrameWnd::CommandAction(unsigned id)
+{
+    QAction *&action = actions_[id];
+    if (action == nullptr) {
+        action = new QAction(this);
+        action->setData(id);
+        connect(action, &QAction::triggered, this, [this, id] { OnCommand(id); });
+    }
+    return action;
+}
+
+QAction *UXTPMDIFrameWnd::AddCommand(QMenu &menu, unsigned id, const QString &text)
+{
+    QAction *action = CommandAction(id);
+    action->setText(text.section(u'\t', 0, 0));
+    if (const QString key = text.section(u'\t', 1, 1); !key.isEmpty()) {
+        action->setShortcut(QKeySequence(key));
+    }
+    menu.addAction(action);
+    connect(&menu, &QMenu::aboutToShow, this, &UXTPMDIFrameWnd::UpdateCommands, Qt::UniqueConnection);
+    return action;
+}
+
+bool UXTPMDIFrameWnd::OnCommand(unsigned id)
+{
+    auto *target = dynamic_cast<kareport::CommandTarget *>(activeView_);
+    return (target != nullptr && target->runCommand(id)) || runCommand(id);
+}
+
+void UXTPMDIFrameWnd::UpdateCommands()
+{
+    const auto *target = dynamic_cast<const kareport::CommandTarget *>(activeView_);
+    for (auto action = actions_.cbegin(); action != actions_.cend(); ++action) {
+        kareport::CommandState state;
+        state.checked = action.value()->isChecked();
+        const bool known =
+            (target != nullptr && target->updateCommand(action.key(), state)) || updateCommand(action.key(), state);
+        action.value()->setEnabled(known && state.enabled);
+        if (action.value()->isCheckable()) {
+            action.value()->setChecked(state.checked);
+        }
+    }
+}
+
+void UXTPMDIFrameWnd::DockPane(COneViewPane &pane)
+{
+    QDockWidget *first = nullptr;
+    for (QDockWidget *dock : findChildren<QDockWidget *>(QString(), Qt::FindDirectChildrenOnly)) {
+        if (dock != pane.GetDock() && dockWidgetArea(dock) == Qt::TopDockWidgetArea && !dock->isFloating()) {
+            first = dock;
+        }
+    }
+    addDockWidget(Qt::TopDockWidgetArea, pane.GetDock());
+    if (first != nullptr) {
+        tabifyDockWidget(first, pane.GetDock());
+    }
+}
+
+const std::vector<kareport::Command> &UXTPMDIFrameWnd::commands() const
+{
+    static const std::vector<kareport::Command> none;
+    return none;
+}

@@ -1,0 +1,109 @@
+#pragma once
+
+#include "CommandTarget.h"
+#include "KaReportExport.h"
+#include "ReportViewPort.h"
+#include "UView.h"
+
+#include <QMargins>
+#include <QPointer>
+#include <QRect>
+#include <QSize>
+#include <QString>
+
+#include <memory>
+#include <vector>
+
+class QPainter;
+class QPrinter;
+class UReportDoc;
+
+namespace kareport
+{
+class ReportEdit;
+class ReportViewWidget;
+
+/// A print job as the view sees it.
+struct PrintInfo
+{
+    QPrinter *printer = nullptr; ///< null until a printer has been prepared
+    int curPage = 1;             ///< the page that is printed now, from 1
+    int maxPage = 0;             ///< the last page; 0 when there is none
+};
+} // namespace kareport
+
+/// The view of a report: its text in one control, in which the user may edit it. Every edit goes straight into the document.
+class KAREPORT_EXPORT UReportView : public UView, public kareport::ReportViewPort, public kareport::CommandTarget
+{
+public:
+    enum WordWrap
+    {
+        WrapNone = 0,
+        WrapToWindow = 1
+    };
+
+    UReportView();
+    ~UReportView() override;
+
+    /// The report shown; may be null.
+    UReportDoc *GetDocument() const;
+    QWidget *GetWidget() override;
+    /// The control that holds the text.
+    kareport::ReportEdit &GetEdit() const;
+    WordWrap GetWordWrap() const { return m_nWordWrap; }
+
+    /// Gives the control its font. @return 0, or -1 when it cannot be made
+    int OnCreate();
+    void OnInitialUpdate() override;
+    void OnUpdate(UView *sender, long hint, void *hintObject) override;
+    /// Loads the control from the document, or the document from the control.
+    void UpdateData(bool toView);
+    /// Replaces the control's content by a text, plain or rich as it begins.
+    void SetRTFText(const QString &text);
+    /// Takes over the whole text of the control.
+    void OnChange();
+    void OnSetFocus();
+    void OnDestroy();
+    /// Closes the application, and the report's window with it.
+    void OnReportExit();
+    void OnSaveReportText();
+
+    bool streamRichText(QIODevice &device) const override;
+    bool streamPlainText(QIODevice &device) const override;
+    const std::vector<kareport::Command> &commands() const override;
+
+    // Printing
+    void OnReportPrint();
+    void OnReportPrintPreview();
+    void OnPageSetup();
+    /// Prepares a job: page count, margins, paper, printer. @return false cancels it
+    bool OnPreparePrinting(kareport::PrintInfo &info);
+    void OnBeginPrinting(QPainter &painter, kareport::PrintInfo &info);
+    void OnEndPrinting(QPainter &painter, kareport::PrintInfo &info);
+    void OnPrepareDC(QPainter &painter, kareport::PrintInfo &info);
+    /// Prints the page `info.curPage`.
+    void OnPrint(QPainter &painter, kareport::PrintInfo &info);
+    /// Prints the characters from `start` to `stop` (-1: to the end) as far as they fit a page.
+    /// @return the first character that was not printed
+    qint64 PrintPage(QPainter &painter, qint64 start, qint64 stop);
+    /// Draws the margins and line places of a page, to look at the print geometry.
+    void DrawMargins(QPainter &painter);
+
+    const QMargins &GetPrintMargins() const { return m_rectMargin; }
+    const QSize &GetPaperSize() const { return m_sizePaper; }
+    /// The first character of each page that is known, page 1 first.
+    const std::vector<qint64> &GetPageStarts() const { return m_aPageStart; }
+
+private:
+    void WrapChanged();
+    QRect printableRect() const; ///< twips
+    std::vector<kareport::Command> makeCommands();
+
+    QPointer<QWidget> widget_;
+    kareport::ReportEdit *edit_ = nullptr; ///< owned by the widget
+    std::vector<kareport::Command> commands_;
+    WordWrap m_nWordWrap = WrapNone;
+    QMargins m_rectMargin; ///< twips
+    QSize m_sizePaper;     ///< twips
+    std::vector<qint64> m_aPageStart;
+};
