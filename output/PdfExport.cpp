@@ -6,14 +6,23 @@
 #include "PdfTypesetter.h"
 #include "Xlate.h"
 
+#include <QHash>
+
 #include <algorithm>
 #include <deque>
+#include <numeric>
 
 namespace kareport
 {
 
 namespace
 {
+
+/// Lines closer than this, in points, are no lines any more.
+constexpr float smallestLeading = 0.05F;
+
+/// Missing characters that are named; the others are counted.
+constexpr std::size_t mostWarnings = 20;
 
 /// Writes one text as a PDF.
 template <typename Text>
@@ -32,6 +41,9 @@ public:
             return fail(Xlate("a font size of 1 point or more was expected"));
         }
         box_ = pdfPageBox(setup);
+        if (box_.right <= box_.left || box_.top <= box_.bottom) {
+            return fail(Xlate("the margins leave no room on the page: smaller margins were expected"));
+        }
         if (!loadFaces()) {
             return false;
         }
@@ -115,6 +127,7 @@ private:
     {
         const double width = (double(box_.right) - double(box_.left)) * 1000 / options_.page.fontSize;
         pieces_.clear();
+        const qint64 firstLine = lineNumber_;
         std::size_t line = 0;
         for (qsizetype at = begin; at < end; ++line) {
             const qsizetype feed = text_.indexOf(u'\n', at);
@@ -136,6 +149,12 @@ private:
         }
         const LinePlacement placement =
             placeLines(options_.page, box_, typesetter_.height(), linesToFit_, qsizetype(pieces_.size()));
+        if (placement.leading < smallestLeading) {
+            return fail(
+                Xlate("the lines %1 to %2 of the report become %3 when they are broken: they do not fit one page")
+                    .arg(QString::number(firstLine + 1), QString::number(lineNumber_),
+                         QString::number(pieces_.size())));
+        }
         return typesetter_.addPage(pdf_, box_, placement, pieces_);
     }
 
@@ -154,12 +173,11 @@ private:
                 continue; // a mark that is not seen where it is known either
             }
             shown += substitute_;
-            const auto known =
-                std::find_if(notes_.missing.begin(), notes_.missing.end(),
-                             [character](const MissingCharacter &m) { return m.character == character; });
-            if (known != notes_.missing.end()) {
-                ++known->count;
+            const auto known = missingAt_.constFind(character);
+            if (known != missingAt_.constEnd()) {
+                ++notes_.missing[*known].count;
             } else {
+                missingAt_.insert(character, notes_.missing.size());
                 notes_.missing.push_back({character, 1, lineNumber_});
             }
         }
@@ -177,6 +195,7 @@ private:
     int widest_ = 0;
     std::vector<char32_t> uncovered_; ///< in order
     QChar substitute_;
+    QHash<char32_t, std::size_t> missingAt_; ///< place among the notes
     qint64 lineNumber_ = 0;
     std::deque<QString> lines_; ///< of the page at hand, used again for every page
     std::vector<QStringView> pieces_;
@@ -194,11 +213,19 @@ bool writeText(QIODevice &device, Text text, const PdfOptions &options, PdfNotes
 QStringList PdfNotes::warnings() const
 {
     QStringList texts;
-    for (const MissingCharacter &entry : missing) {
+    for (std::size_t i = 0; i < std::min(missing.size(), mostWarnings); ++i) {
+        const MissingCharacter &entry = missing[i];
         const QString code = QString::number(entry.character, 16).toUpper().rightJustified(4, u'0');
         texts += Xlate("no font has the character \"%1\" (U+%2), first in line %3, %4 times in all")
                      .arg(QString::fromUcs4(&entry.character, 1), code, QString::number(entry.firstLine),
                           QString::number(entry.count));
+    }
+    if (missing.size() > mostWarnings) {
+        const qint64 others =
+            std::accumulate(missing.begin() + mostWarnings, missing.end(), qint64(0),
+                            [](qint64 sum, const MissingCharacter &entry) { return sum + entry.count; });
+        texts += Xlate("no font has %1 other characters, %2 times in all")
+                     .arg(QString::number(missing.size() - mostWarnings), QString::number(others));
     }
     return texts;
 }

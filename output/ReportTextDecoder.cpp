@@ -40,12 +40,14 @@ std::optional<TextPlace> firstInvalid(QByteArrayView bytes)
 std::optional<TextPlace> decodeReportText(QByteArrayView bytes, QString &text)
 {
     const QByteArrayView mark(reportFileMark, sizeof reportFileMark);
-    const bool isReportFile = bytes.startsWith(mark);
+    const bool hasMark = bytes.startsWith(mark);
     if (const auto place = firstInvalid(bytes)) {
         return place;
     }
-    text = QString::fromUtf8(isReportFile ? bytes.sliced(mark.size()) : bytes);
-    if (isReportFile) {
+    text = QString::fromUtf8(hasMark ? bytes.sliced(mark.size()) : bytes);
+    // Editors write the mark as well, but no line end of theirs has a CR too many.
+    const bool hasDoubledEnds = text.contains(u"\r\r\n") || !text.contains(u'\n');
+    if (hasMark && hasDoubledEnds) {
         // Written with a CR more than the text has before each LF. In place, since the text only gets shorter.
         QChar *out = text.data();
         const QChar *const end = text.constData() + text.size();

@@ -8,7 +8,8 @@
 namespace kareport
 {
 
-/// The stem of the temporary files of a report: its own name without the last three letters, or "Report$$$".
+/// The stem of the temporary files of a report: its own name where it has no extension, what an extension has beyond three
+/// letters where it is longer, else "Report$$$".
 KAREPORT_EXPORT QString temporaryStem(const QString &reportFileName);
 
 /// Names for temporary report files. Each is handed out once; what the file system holds is not looked at.

@@ -23,6 +23,7 @@ PageWriter::PageWriter(PageWriterObserver *observer, ReportText::Reallocate real
 void PageWriter::clear()
 {
     text_.clear();
+    hasLostText_ = false;
     lineCount_ = 0;
     heading_.text.clear();
     noteChange();
@@ -34,6 +35,7 @@ bool PageWriter::write(QStringView text, int style)
         return write(text.toString(), style);
     }
     if (!text_.append(text)) {
+        hasLostText_ = true;
         return false;
     }
     const int lineFeeds = countLineFeeds(text);
@@ -49,6 +51,7 @@ void PageWriter::lineFeed(qint64 count)
 {
     for (qint64 i = 0; i < count; ++i) {
         if (!text_.appendLineEnd()) {
+            hasLostText_ = true;
             return;
         }
         if (observer_ != nullptr) {

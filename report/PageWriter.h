@@ -40,6 +40,10 @@ public:
     ReportText &text() { return text_; }
     const ReportText &text() const { return text_; }
 
+    /// Whether a part of what was to be written since the last `clear` is missing, for want of memory.
+    bool hasLostText() const { return hasLostText_; }
+    void noteLostText() { hasLostText_ = true; }
+
     int lineNumber() const { return lineNumber_; } ///< line on the page; 1 right after a page break
     int lineCount() const { return lineCount_; }   ///< lines since the last `clear`; 0: nothing has been written
     int pageNumber() const { return pageNumber_; } ///< from 1
@@ -84,6 +88,7 @@ private:
 
     PageWriterObserver *observer_;
     ReportText text_;
+    bool hasLostText_ = false;
     int lineNumber_ = 0;
     int lineCount_ = 0;
     int pageNumber_ = 0;

@@ -29,6 +29,11 @@ std::optional<RichTextError> showReportContent(const UReportDoc &report, QTextDo
         text = report.GetText().toString();
     }
     if (isRichText(text)) {
+        if (report.IsOpenedFromRtf()) {
+            // The bytes of the file, one to a character, each line with the line end that loading gave it.
+            QByteArray bytes = text.toLatin1();
+            return readRichText(bytes.replace("\n\r\n", "\n"), document, notes);
+        }
         return readRichText(text, document, notes);
     }
     document.setPlainText(text);

@@ -56,7 +56,9 @@ bool UReportDoc::IsReportAvailable(const UReportDoc *report)
 
 void UReportDoc::SetData(const QString &text)
 {
-    page_.text().assign(text);
+    if (!page_.text().assign(text)) {
+        page_.noteLostText();
+    }
 }
 
 void UReportDoc::Clear()

@@ -57,6 +57,9 @@ public:
     /// The same with its length, for texts that hold a character 0.
     QStringView GetText() const { return page_.text().view(); }
     bool IsEmpty() const { return page_.text().isEmpty(); }
+    /// Whether a part of what was to be written since the last `Clear` is missing, for want of memory. Such a report is not
+    /// saved.
+    bool HasLostText() const { return page_.hasLostText(); }
     /// Writes the text to an open device, in UTF-8. @return false as soon as a write fails
     bool WriteText(QIODevice &device, kareport::LineEnds lineEnds) const;
     /// Writes the text to an open device as a PDF. @param notes  receives what is missing or went wrong; may be null
@@ -66,6 +69,13 @@ public:
                   const std::function<bool(qint64, qint64)> &progress = {}) const;
     /// Replaces the text as it is. Counters stay, so what is written next continues the old pages.
     void SetData(const QString &text);
+    /// Replaces a piece of the text as it is, in a time that does not grow with the text as long as edits follow each
+    /// other at one place. Counters stay. @param at  the first character replaced, from 0
+    /// @return false, changing nothing, for a piece that is not in the text or when there is no memory
+    bool ReplaceText(qint64 at, qint64 removed, QStringView inserted);
+    /// The text's length in characters, and the text as a copy: neither changes how the text is kept.
+    qint64 GetTextLength() const { return page_.text().size(); }
+    QString CopyText() const;
     /// Empties the report. The next line written begins page 1.
     virtual void Clear();
     /// Makes room for so many characters of the kind written so far. @return 0 when there is no memory for them
@@ -220,6 +230,8 @@ public:
 
     void SetExternalEditorFlag(bool on) { externalEditor_ = on; }
     bool GetExternalEditorFlag() const { return externalEditor_; }
+    /// Whether the report's text was loaded from a rich-text file.
+    bool IsOpenedFromRtf() const { return openedFromRtf_; }
     void SetOptionExcel() { exportOptions_ |= optionExcel; }
     bool IsOptionExcel() const { return (exportOptions_ & optionExcel) != 0; }
     void SetExternalExcel() { exportOptions_ |= externalExcel; }

@@ -149,6 +149,9 @@ bool UReportDoc::saveText(const QString &path)
 
 bool UReportDoc::WriteText(QIODevice &device, kareport::LineEnds lineEnds) const
 {
+    if (HasLostText()) {
+        return false;
+    }
     const kareport::ReportText &text = page_.text();
     return text.isNarrow() ? kareport::writeReportText(device, text.narrowView(), lineEnds)
                            : kareport::writeReportText(device, text.view(), lineEnds);
@@ -157,6 +160,9 @@ bool UReportDoc::WriteText(QIODevice &device, kareport::LineEnds lineEnds) const
 bool UReportDoc::WritePdf(QIODevice &device, kareport::PdfNotes *notes,
                           const std::function<bool(qint64, qint64)> &progress) const
 {
+    if (HasLostText()) {
+        return false;
+    }
     kareport::PdfOptions options;
     options.page = {geometry_.pageSize, geometry_.resolution, margins_, fontSize_, GetLinesPerPage()};
     options.lineCount = GetLineCount();

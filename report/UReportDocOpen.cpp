@@ -62,7 +62,7 @@ void UReportDoc::Serialize(UArchive &archive)
     SetHeaderFlag(false);
     isSerializing_ = true;
     if (LoadFile(archive.GetFilePath(), true) == 0) {
-        archive.Abandon(); // it has gone meanwhile
+        archive.Abandon(); // it has gone meanwhile, or there is no memory for it
     }
     isSerializing_ = false;
     SetHeaderFlag(headerFlag);
@@ -112,5 +112,5 @@ int UReportDoc::LoadFile(const QString &path, bool keepLineEnds)
         page_.countLine();
     }
     UpdateAllViews(nullptr, 0, nullptr);
-    return 1;
+    return HasLostText() ? 0 : 1;
 }

@@ -118,6 +118,7 @@ try {
         .writeTable(*table_, *list, {linesBefore, linesAfter, headingLinesAfter, chainageLabel_, writeTableName_});
     return true;
 } catch (const std::bad_alloc &) {
+    page_.noteLostText();
     page_.setHeading({QString(), 0, 2}); // the table's own must not stand over what is written next
     return false;
 }

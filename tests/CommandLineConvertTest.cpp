@@ -135,4 +135,53 @@ TEST(CommandLineConvert, WhatIsPassedOverIsSaid)
     EXPECT_EQ(folder.run("convert a.rtf - --quiet").err, "");
 }
 
+TEST(CommandLineConvert, APdfOfRichTextHasTheReportsPages)
+{
+    const CommandLineFolder folder;
+    folder.put("paged.json", pagedJob());
+    ASSERT_EQ(folder.run("render paged.json -o a.rtf -o a.pdf").status, 0);
+    ASSERT_EQ(folder.run("convert a.rtf b.pdf").status, 0);
+    EXPECT_TRUE(folder.bytesOf("a.pdf") == folder.bytesOf("b.pdf"));
+}
+
+TEST(CommandLineConvert, ANoBreakSpaceStaysOne)
+{
+    const CommandLineFolder folder;
+    folder.put("a.txt", "a\xC2\xA0m\n");
+    ASSERT_EQ(folder.run("convert a.txt a.rtf").status, 0);
+    EXPECT_EQ(folder.run("convert a.rtf -").out, "a\xC2\xA0m\n");
+}
+
+TEST(CommandLineConvert, RichTextMayHaveSomethingInFront)
+{
+    for (const char *front : {"", "\xEF\xBB\xBF", " \r\n\t", "\xEF\xBB\xBF\n"}) {
+        const CommandLineFolder folder;
+        folder.put("a.rtf", QByteArray(front) + "{\\rtf1 x\\par}");
+        EXPECT_EQ(folder.run("convert a.rtf -").out, "x\n");
+    }
+}
+
+TEST(CommandLineConvert, MarginsThatLeaveNoRoomAreSaid)
+{
+    struct Row
+    {
+        const char *line;
+        int status;
+    };
+    const Row rows[] = {
+        {"convert a.txt a.pdf --set page.linesPerPage=9 --set page.margins=[99999,1000,1200,2000]", 3},
+        {"convert a.txt a.pdf --set page.linesPerPage=9 --set page.margins=[1000,40000,1200,2000]", 3},
+        {"convert a.txt a.pdf --set page.margins=[0,99999,0,0]", 1},
+    };
+    const CommandLineFolder folder;
+    folder.put("a.txt", "a\n");
+    for (const Row &row : rows) {
+        const ProgramRun run = folder.run(row.line);
+        EXPECT_EQ(run.status, row.status) << run.all().constData();
+        EXPECT_TRUE(run.err.startsWith("kareport: ") && run.err.contains("the margins leave no room"))
+            << run.all().constData();
+        EXPECT_FALSE(QFile::exists(folder.path("a.pdf")));
+    }
+}
+
 } // namespace

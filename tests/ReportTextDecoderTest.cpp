@@ -29,7 +29,10 @@ TEST(ReportTextDecoder, ReadsWhatReportFilesHold)
          QStringLiteral("A\r\nB\r\n"), "the doubled line ends are one each"},
         {"\xEF\xBB\xBF"
          "A\r\nB",
-         QStringLiteral("A\nB"), "a bare LF of the text was written as CR LF"},
+         QStringLiteral("A\r\nB"), "no line end has a CR too many: an editor wrote it"},
+        {"\xEF\xBB\xBF"
+         "A\r\nB\r\r\n",
+         QStringLiteral("A\nB\r\n"), "a bare LF of the text was written as CR LF"},
         {"\xEF\xBB\xBF"
          "A\rB\r",
          QStringLiteral("A\rB\r"), "a CR alone is a character, at the end as well"},
@@ -83,7 +86,7 @@ TEST(ReportTextDecoder, GivesBackEveryTextThatIsWritten)
                                   QString::fromUtf8("😀"), QString(QChar(0))};
     QRandomGenerator random(20);
     for (int round = 0; round < 500; ++round) {
-        QString text;
+        QString text = QStringLiteral("first line\r\n"); // as reports end their lines
         for (quint32 count = random.bounded(40u); count > 0; --count) {
             text += parts[random.bounded(int(parts.size()))];
         }

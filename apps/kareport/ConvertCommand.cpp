@@ -10,9 +10,10 @@
 #include "RichTextReader.h"
 #include "Xlate.h"
 
-#include <QGuiApplication>
 #include <QJsonArray>
 #include <QTextDocument>
+
+#include <new>
 
 namespace kareport
 {
@@ -46,13 +47,27 @@ std::optional<InputError> readRichText(const QString &path, QByteArrayView bytes
     if (const auto error = kareport::readRichText(bytes, document, &notes)) {
         return InputError{path, error->place, error->text};
     }
-    saved.text = document.toPlainText();
+    // Not as plain text, which has blanks for no-break spaces.
+    saved.text = document.toRawText();
+    for (QChar &character : saved.text) {
+        if (character == QChar::ParagraphSeparator || character == QChar::LineSeparator) {
+            character = u'\n';
+        }
+    }
     if (!saved.text.isEmpty() && !saved.text.endsWith(u'\n')) {
         saved.text += u'\n'; // the last paragraph is a line as well
     }
     saved.text.replace(u'\n', QStringLiteral("\r\n"));
     saved.warnings = notes.texts();
     return std::nullopt;
+}
+
+/// The rich text of a file that may begin with a byte-order mark or white space; empty when it is no rich text.
+QByteArrayView richTextIn(QByteArrayView bytes)
+{
+    constexpr QByteArrayView mark("\xEF\xBB\xBF");
+    const QByteArrayView text = bytes.sliced(bytes.startsWith(mark) ? mark.size() : 0).trimmed();
+    return isRichText(text) ? bytes.sliced(text.data() - bytes.data()) : QByteArrayView();
 }
 
 /// Writes a text into a report that is kept in rich-text mode as well: line by line, as reports are written.
@@ -104,9 +119,18 @@ ExitStatus ConvertCommand::run(int &argc, char **argv) const
     }
     const std::string_view view = std::get<std::shared_ptr<const FileBytes>>(file)->view();
     const QByteArrayView bytes(view.data(), static_cast<qsizetype>(view.size()));
-    const bool isRich = isRichText(bytes);
+    const QByteArrayView richText = richTextIn(bytes);
+    const bool isRich = !richText.isEmpty();
+    std::unique_ptr<QCoreApplication> application;
+    if (isRich) {
+        application = startQt(argc, argv, true);
+    }
     SavedReport saved;
-    std::optional<InputError> error = isRich ? std::nullopt : readText(input, bytes, saved);
+    std::optional<InputError> error = isRich ? readRichText(input, richText, saved) : readText(input, bytes, saved);
+    if (error) {
+        printError(error->message());
+        return exitInput;
+    }
     // The pages of a PDF are those that the report was written in; no other kind has pages.
     if (!job.page.linesPerPage) {
         job.page.linesPerPage = job.outputs.front().kind == OutputKind::Pdf
@@ -114,26 +138,23 @@ ExitStatus ConvertCommand::run(int &argc, char **argv) const
                                     : PageGeometry().linesPerPage;
     }
     job.page.charsPerRow = job.page.charsPerRow.value_or(PageGeometry().charsPerRow);
-    const auto application = startQt(argc, argv, isRich || JobRunner::needsFonts(job) || needsFonts(job.outputs));
-    if (isRich) {
-        error = readRichText(input, bytes, saved);
-    }
-    if (error) {
-        printError(error->message());
-        return exitInput;
+    if (!application) {
+        application = startQt(argc, argv, JobRunner::needsFonts(job) || needsFonts(job.outputs));
     }
     Progress bar(progress);
     JobRunner runner(job, source, bar);
     error = runner.run();
     if (error) {
-        printError(error->message());
-        return exitInput;
+        return usageExit(Xlate("--set: %1").arg(error->text)); // no input is left that could be wrong
     }
     UReportDoc &report = runner.report();
     if (report.GetRTFDataFlag()) {
         writeLines(report, saved.text);
     } else {
         report.Write(saved.text, 0);
+    }
+    if (report.HasLostText()) {
+        throw std::bad_alloc();
     }
     // The report holds it all now.
     file = InputError();

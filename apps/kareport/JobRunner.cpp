@@ -18,6 +18,7 @@
 #include <QFileInfo>
 
 #include <algorithm>
+#include <new>
 
 namespace kareport
 {
@@ -48,6 +49,9 @@ public:
             std::visit(*this, step.action);
             if (error_ || runner_.source_.failed() || isInterrupted()) {
                 break;
+            }
+            if (report_.HasLostText()) {
+                throw std::bad_alloc(); // half a report is none
             }
         }
         return error_ ? error_ : runner_.source_.error();

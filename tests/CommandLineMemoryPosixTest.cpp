@@ -1,0 +1,54 @@
+#include "CommandLine.h"
+
+#include <sys/resource.h>
+
+#include <gtest/gtest.h>
+
+namespace
+{
+
+/// Runs the program with so much memory that it can address.
+ProgramRun runWithin(const QString &folder, const QStringList &arguments, rlim_t megabytes)
+{
+    QProcess process;
+    process.setWorkingDirectory(folder);
+    process.setChildProcessModifier([megabytes] {
+        const rlimit limit = {megabytes << 20, megabytes << 20};
+        setrlimit(RLIMIT_AS, &limit);
+    });
+    process.start(QStringLiteral(KAREPORT_PROGRAM), arguments, QIODevice::ReadOnly);
+    ProgramRun run;
+    const bool ended = process.waitForFinished(60'000);
+    run.status = ended && process.exitStatus() == QProcess::NormalExit ? process.exitCode() : -1;
+    run.out = process.readAllStandardOutput();
+    run.err = process.readAllStandardError();
+    return run;
+}
+
+/// The program itself needs this much.
+constexpr rlim_t ownMegabytes = 200;
+
+TEST(CommandLineMemory, AReportThatDoesNotFitIsNotWrittenInPart)
+{
+#if defined(__SANITIZE_ADDRESS__)
+    GTEST_SKIP() << "the address sanitizer needs more address space than any limit leaves";
+#endif
+    const CommandLineFolder folder;
+    folder.put("big.txt", QByteArray("0123456789\n").repeated(6'000'000));
+    folder.put("out.rep", "kept");
+    bool wasRefused = false;
+    for (const rlim_t megabytes : {rlim_t(150), rlim_t(250), rlim_t(350), rlim_t(450), rlim_t(550)}) {
+        const ProgramRun run = runWithin(folder.path(), words("convert big.txt out.rep"), ownMegabytes + megabytes);
+        if (run.status == 0) {
+            EXPECT_EQ(folder.bytesOf("out.rep").size(), 3 + 6'000'000 * 13) << megabytes << ": all of it or nothing";
+            break;
+        }
+        wasRefused = true;
+        EXPECT_EQ(run.status, 2) << run.all().constData();
+        EXPECT_EQ(run.err, "kareport: error: there is not enough memory for this input\n") << megabytes;
+        EXPECT_EQ(folder.bytesOf("out.rep"), "kept") << megabytes;
+    }
+    EXPECT_TRUE(wasRefused);
+}
+
+} // namespace
