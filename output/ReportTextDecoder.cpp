@@ -1,7 +1,9 @@
 #include "ReportTextDecoder.h"
 
+#include "LineEndings.h"
 #include "ReportTextCodec.h"
 
+#include <QStringDecoder>
 #include <QUtf8StringView>
 
 namespace kareport
@@ -44,7 +46,9 @@ std::optional<TextPlace> decodeReportText(QByteArrayView bytes, QString &text)
     if (const auto place = firstInvalid(bytes)) {
         return place;
     }
-    text = QString::fromUtf8(hasMark ? bytes.sliced(mark.size()) : bytes);
+    // A second mark is a character of the text.
+    QStringDecoder decode(QStringDecoder::Utf8, QStringDecoder::Flag::ConvertInitialBom);
+    text = decode(hasMark ? bytes.sliced(mark.size()) : bytes);
     // Editors write the mark as well, but no line end of theirs has a CR too many.
     const bool hasDoubledEnds = text.contains(u"\r\r\n") || !text.contains(u'\n');
     if (hasMark && hasDoubledEnds) {
@@ -58,8 +62,7 @@ std::optional<TextPlace> decodeReportText(QByteArrayView bytes, QString &text)
         }
         text.truncate(out - text.constData());
     } else {
-        text.replace(QStringLiteral("\r\n"), QStringLiteral("\n"));
-        text.replace(QStringLiteral("\n"), QStringLiteral("\r\n"));
+        text = withCrLf(text);
     }
     return std::nullopt;
 }

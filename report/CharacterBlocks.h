@@ -5,15 +5,23 @@
 #include <algorithm>
 #include <cstddef>
 #include <cstdlib>
+#include <cstring>
+#include <functional>
+#include <type_traits>
 
 namespace kareport
 {
 
 /// A growing run of characters with a 0 behind the last. Its capacity is counted in blocks and zeroed block by block;
 /// the memory behind it grows geometrically, so that a text of any length is copied a constant number of times.
+///
+/// What is free lies behind the last character or, while pieces are replaced, as a gap where the last one was: pieces
+/// that are replaced from the front to the back move the text once. Whoever reads the text closes the gap.
 template <typename Character>
 class CharacterBlocks
 {
+    static_assert(std::is_trivially_copyable_v<Character>);
+
 public:
     using Reallocate = void *(*)(void *memory, std::size_t bytes);
 
@@ -25,8 +33,15 @@ public:
     CharacterBlocks(const CharacterBlocks &) = delete;
     CharacterBlocks &operator=(const CharacterBlocks &) = delete;
 
-    /// Null before the first successful `reserve`.
-    Character *data() const { return data_; }
+    /// All characters in one piece; null before the first successful `reserve`.
+    Character *data() const
+    {
+        if (gapAt_ != size_) {
+            moveGap(size_);
+            data_[size_] = Character(0);
+        }
+        return data_;
+    }
     qint64 size() const { return size_; }
 
     /// Makes room for so many characters and the 0 behind them.
@@ -35,12 +50,45 @@ public:
     void setSize(qint64 size)
     {
         size_ = size;
+        gapAt_ = size;
         data_[size_] = Character(0);
+    }
+    /// Replaces characters by others; `inserted` must not lie in this text. @return false, changing nothing, when there is
+    /// no room
+    template <typename Source>
+    bool replace(qint64 at, qint64 removed, const Source *inserted, qint64 count)
+    {
+        const qint64 size = size_ - removed + count;
+        if (size > usable_) {
+            data(); // growing keeps what lies in one piece
+            if (!grow(size)) {
+                return false;
+            }
+        }
+        if (gapAt_ < at) {
+            moveGap(at);
+        } else if (gapAt_ > at + removed) {
+            moveGap(at + removed);
+        }
+        // What is removed now touches the gap on one side or both, and becomes a part of it.
+        std::transform(inserted, inserted + count, data_ + at, [](Source c) { return static_cast<Character>(c); });
+        gapAt_ = at + count;
+        size_ = size;
+        if (gapAt_ == size_) {
+            data_[size_] = Character(0);
+        }
+        return true;
+    }
+    /// Whether an address lies in the memory of this text.
+    bool holds(const Character *address) const
+    {
+        return std::less_equal<>()(data_, address) && std::less_equal<>()(address, data_ + usable_);
     }
     /// Empties the text and goes back to one block, or to none.
     void clear(bool keepBlock)
     {
         size_ = 0;
+        gapAt_ = 0;
         usable_ = 0;
         if (!keepBlock) {
             std::free(data_);
@@ -83,11 +131,24 @@ private:
         return true;
     }
 
+    void moveGap(qint64 to) const
+    {
+        const qint64 gap = usable_ - size_;
+        if (to < gapAt_) {
+            std::memmove(data_ + to + gap, data_ + to, static_cast<std::size_t>(gapAt_ - to) * sizeof(Character));
+        } else {
+            std::memmove(data_ + gapAt_, data_ + gapAt_ + gap,
+                         static_cast<std::size_t>(to - gapAt_) * sizeof(Character));
+        }
+        gapAt_ = to;
+    }
+
     Reallocate reallocate_;
     Character *data_ = nullptr;
     qint64 size_ = 0;
-    qint64 usable_ = 0;    ///< characters that fit into the counted blocks, all of them allocated and zeroed
-    qint64 allocated_ = 0; ///< characters that fit into the memory
+    mutable qint64 gapAt_ = 0; ///< characters before the gap; where it is the size, the text is in one piece
+    qint64 usable_ = 0;        ///< characters that fit into the counted blocks, all of them allocated and zeroed
+    qint64 allocated_ = 0;     ///< characters that fit into the memory
 };
 
 } // namespace kareport

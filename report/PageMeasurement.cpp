@@ -46,7 +46,7 @@ PageDevice builtInDevice(bool portrait)
 {
     const DefaultPrinter &printer = defaultPrinter();
     // Not QPageSize::sizePixels: it counts in whole points, which is several dots off at a printer's resolution.
-    const QSizeF millimetres = QPageSize(sheetOf(printer.paper)).size(QPageSize::Millimeter);
+    const QSizeF millimetres = builtInSheet().size(QPageSize::Millimeter);
     const QSize upright = (millimetres * printer.resolution / millimetresPerInch).toSize();
     return {portrait ? upright : upright.transposed(), printer.resolution};
 }
@@ -80,6 +80,21 @@ PageGeometry measurePage(const PageDevice &device, const QMargins &margins, cons
     return geometry;
 }
 
+QPrinterInfo applicationPrinter()
+{
+    if (defaultPrinter().source != PrinterSource::SystemOrBuiltIn) {
+        return QPrinterInfo();
+    }
+    const QPrinterInfo selected = QPrinterInfo::printerInfo(defaultPrinter().name);
+    // A selected printer that is no longer installed leaves the system's.
+    return selected.isNull() ? QPrinterInfo::defaultPrinter() : selected;
+}
+
+QPageSize builtInSheet()
+{
+    return QPageSize(sheetOf(defaultPrinter().paper));
+}
+
 std::optional<PageDevice> defaultPageDevice(bool portrait)
 {
     switch (defaultPrinter().source) {
@@ -87,7 +102,7 @@ std::optional<PageDevice> defaultPageDevice(bool portrait)
     case PrinterSource::BuiltIn: return builtInDevice(portrait);
     case PrinterSource::SystemOrBuiltIn: break;
     }
-    const QPrinterInfo info = QPrinterInfo::defaultPrinter();
+    const QPrinterInfo info = applicationPrinter();
     return info.isNull() ? builtInDevice(portrait) : printerDevice(info, portrait);
 }
 

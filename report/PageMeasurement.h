@@ -8,6 +8,9 @@
 
 #include <optional>
 
+class QPageSize;
+class QPrinterInfo;
+
 namespace kareport
 {
 
@@ -44,6 +47,12 @@ KAREPORT_EXPORT PageGeometry measurePage(const PageDevice &device, const QMargin
 
 /// The application's default printer, upright or not; nothing when there is none.
 KAREPORT_EXPORT std::optional<PageDevice> defaultPageDevice(bool portrait);
+
+/// The installed printer that the application prints on: the one that the user has selected, or the system's default. Null
+/// when there is none, or when the host has not chosen the system's printers.
+KAREPORT_EXPORT QPrinterInfo applicationPrinter();
+/// The sheet of the built-in page device.
+KAREPORT_EXPORT QPageSize builtInSheet();
 
 /// The extents of a fixed-pitch face at a size in points on a device. A face that is not installed is replaced by the
 /// nearest fixed-pitch face. Needs a running QGuiApplication.

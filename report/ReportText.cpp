@@ -3,7 +3,6 @@
 #include <QString>
 
 #include <algorithm>
-#include <functional>
 #include <new>
 
 namespace kareport
@@ -44,11 +43,33 @@ QStringView ReportText::view() const
 
 QLatin1StringView ReportText::narrowView() const
 {
+    settle();
     return {reinterpret_cast<const char *>(narrow_.data()), isNarrow_ ? narrow_.size() : 0};
+}
+
+bool ReportText::replaceNow(qint64 at, qint64 removed, QStringView inserted) const
+{
+    return isNarrow_ ? narrow_.replace(at, removed, inserted.utf16(), inserted.size())
+                     : wide_.replace(at, removed, inserted.utf16(), inserted.size());
+}
+
+void ReportText::settle() const
+{
+    if (pending_.isEmpty()) {
+        return;
+    }
+    // In the order of their places, so that the text is moved once for all of them.
+    qint64 shift = 0;
+    for (const PendingEdits::Edit &edit : pending_.edits()) {
+        replaceNow(edit.at + shift, edit.removed, edit.inserted);
+        shift += edit.inserted.size() - edit.removed;
+    }
+    pending_.clear();
 }
 
 bool ReportText::widen() const
 {
+    settle();
     if (!isNarrow_) {
         return true;
     }
@@ -64,12 +85,12 @@ bool ReportText::widen() const
 
 bool ReportText::owns(QStringView text) const
 {
-    const char16_t *begin = text.utf16();
-    return !isNarrow_ && std::less_equal<>()(wide_.data(), begin) && std::less<>()(begin, wide_.data() + wide_.size());
+    return !isNarrow_ && wide_.holds(text.utf16());
 }
 
 bool ReportText::append(QStringView text)
 {
+    settle();
     if (size() + text.size() > longest) {
         return false;
     }
@@ -95,6 +116,7 @@ bool ReportText::append(QStringView text)
 
 bool ReportText::appendLineEnd()
 {
+    settle();
     const qint64 end = size();
     if (!reserve(end + 3)) {
         return false;
@@ -114,12 +136,38 @@ bool ReportText::appendLineEnd()
 bool ReportText::assign(QStringView text)
 {
     const QString copy = text.toString(); // it may be a piece of this very text
+    pending_.clear();
     (isNarrow_ ? narrow_.setSize(0) : wide_.setSize(0));
     return append(copy);
 }
 
+bool ReportText::replace(qint64 at, qint64 removed, QStringView inserted)
+{
+    if (at < 0 || removed < 0 || at > size() || removed > size() - at) {
+        return false;
+    }
+    if (owns(inserted)) {
+        return replace(at, removed, inserted.toString());
+    }
+    if (isNarrow_ && !isLatin1(inserted) && !widen()) {
+        return false;
+    }
+    // The room is got now: carrying the edits out later cannot fail.
+    const qint64 kept = size() - pending_.growth();
+    if (inserted.size() <= longestPending && reserve(kept + pending_.inserted() + inserted.size())) {
+        pending_.replace(at, removed, inserted);
+        if (pending_.edits().size() > mostPending) {
+            settle();
+        }
+        return true;
+    }
+    settle();
+    return replaceNow(at, removed, inserted);
+}
+
 void ReportText::clear()
 {
+    pending_.clear();
     // The narrow block comes first, so that there is a block also when no other can be had.
     if (!isNarrow_ && narrow_.reserve(1)) {
         wide_.clear(false);

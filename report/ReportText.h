@@ -2,6 +2,7 @@
 
 #include "CharacterBlocks.h"
 #include "KaReportExport.h"
+#include "PendingEdits.h"
 
 #include <QLatin1StringView>
 #include <QStringView>
@@ -30,7 +31,7 @@ public:
     /// The characters in UTF-16, with a 0 behind the last; valid until the next change. A text that cannot be had in
     /// UTF-16 for want of memory shows as an empty one; `size` still says its length.
     const char16_t *data() const;
-    qint64 size() const { return isNarrow_ ? narrow_.size() : wide_.size(); }
+    qint64 size() const { return (isNarrow_ ? narrow_.size() : wide_.size()) + pending_.growth(); }
     bool isEmpty() const { return size() == 0; }
     QStringView view() const;
 
@@ -52,16 +53,26 @@ public:
     bool appendLineEnd();
     /// Replaces the text. @return false when there is no room; the text is then empty
     bool assign(QStringView text);
+    /// Replaces a piece of the text. An edit costs what is typed, wherever it is: the edits are carried out in the long
+    /// text together, when it is next read.
+    /// @return false, changing nothing, for a piece that is not in the text or when there is no room
+    bool replace(qint64 at, qint64 removed, QStringView inserted);
     /// Empties the text and goes back to one block.
     void clear();
 
 private:
+    static constexpr std::size_t mostPending = 4096;        ///< edits
+    static constexpr qint64 longestPending = 2 * blockSize; ///< characters inserted by one of them
+
     bool widen() const;
+    void settle() const;
+    bool replaceNow(qint64 at, qint64 removed, QStringView inserted) const;
 
     // How the text is kept is nothing that a reader sees, so it changes in a const text as well.
     mutable CharacterBlocks<unsigned char> narrow_;
     mutable CharacterBlocks<char16_t> wide_;
     mutable bool isNarrow_ = true;
+    mutable PendingEdits pending_;
 };
 
 } // namespace kareport

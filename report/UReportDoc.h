@@ -69,8 +69,8 @@ public:
                   const std::function<bool(qint64, qint64)> &progress = {}) const;
     /// Replaces the text as it is. Counters stay, so what is written next continues the old pages.
     void SetData(const QString &text);
-    /// Replaces a piece of the text as it is, in a time that does not grow with the text as long as edits follow each
-    /// other at one place. Counters stay. @param at  the first character replaced, from 0
+    /// Replaces a piece of the text as it is, in a time that does not grow with the text. Counters stay.
+    /// @param at  the first character replaced, from 0
     /// @return false, changing nothing, for a piece that is not in the text or when there is no memory
     bool ReplaceText(qint64 at, qint64 removed, QStringView inserted);
     /// The text's length in characters, and the text as a copy: neither changes how the text is kept.

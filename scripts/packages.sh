@@ -25,6 +25,8 @@ packages_test=(
     python3                 # the check scripts
     poppler-utils           # PDFs read back as text, as pictures, their fonts
     qpdf                    # PDFs checked
+    cups-daemon cups-client # a print queue
+    cups-filters cups-filters-core-drivers cups-core-drivers # what a queue makes of a job
     fonts-liberation2       # a second fixed-pitch face
     fonts-wqy-zenhei        # a face with CJK
 )

@@ -44,10 +44,9 @@ TEST(PdfExportLimits, APageThatCannotBeIsRefused)
         {[](PdfOptions &o) { o.page.linesPerPage = 0; }, u"the page has not been measured", "no lines on a page"},
         {[](PdfOptions &o) { o.page.linesPerPage = -1; }, u"the page has not been measured", "fewer than no lines"},
         {[](PdfOptions &o) { o.page = {}; }, u"the page has not been measured", "nothing was measured"},
-        {[](PdfOptions &o) { o.page.fontSize = 0; }, u"", "no font size"},
-        {[](PdfOptions &o) { o.page.pageSize = QSize(0, 0); }, u"the PDF library failed with error 0x", "no sheet"},
-        {[](PdfOptions &o) { o.page.pageSize = QSize(-5100, 6600); }, u"the PDF library failed with error 0x",
-         "a negative sheet"},
+        {[](PdfOptions &o) { o.page.fontSize = 0; }, u"a font size of 1 point or more", "no font size"},
+        {[](PdfOptions &o) { o.page.pageSize = QSize(0, 0); }, u"the margins leave no room", "no sheet"},
+        {[](PdfOptions &o) { o.page.pageSize = QSize(-5100, 6600); }, u"the margins leave no room", "a negative sheet"},
         {[](PdfOptions &o) { o.page.pageSize = QSize(121000, 6600); }, u"the PDF library failed with error 0x",
          "a sheet that is larger than a PDF has"},
     };
@@ -111,24 +110,28 @@ TEST(PdfExportLimits, ADeviceThatFailsEndsInFalse)
     }
 }
 
-TEST(PdfExportLimits, MarginsThatLeaveNoRoomLoseNoText)
+TEST(PdfExportLimits, MarginsThatLeaveNoRoomAreRefused)
 {
-    const QMargins rows[] = {
-        QMargins(10500, 0, 10500, 0), QMargins(20000, 0, 20000, 0), QMargins(0, 20000, 0, 20000),
-        QMargins(0, 14850, 0, 14850), QMargins(0, 0, 21000, 0),
-    };
+    const QMargins rows[] = {QMargins(20000, 0, 20000, 0), QMargins(0, 20000, 0, 20000), QMargins(0, 0, 40000, 0),
+                             QMargins(0, 40000, 0, 0)};
     for (const QMargins &margins : rows) {
         PdfOptions options = pdfOptions(2);
         options.page.margins = margins;
-        QBuffer buffer;
-        buffer.open(QIODevice::WriteOnly);
-        PdfNotes notes;
-        ASSERT_TRUE(writePdf(buffer, u"AB C\r\nDE\r\n", options, &notes)) << notes.problem.toStdString();
-        const PdfReadBack pdf(buffer.data());
-        EXPECT_EQ(pdf.pageCount(), 1);
-        EXPECT_EQ(pdf.check(), QString());
-        EXPECT_EQ(pdf.fonts().size(), 1U);
+        const Attempt result = attempt(u"AB C\r\nDE\r\n", options);
+        EXPECT_FALSE(result.done) << "text beside the sheet is text that is missing";
+        EXPECT_TRUE(result.problem.startsWith(u"the margins leave no room")) << result.problem.toStdString();
+        EXPECT_TRUE(result.bytes.isEmpty());
     }
+}
+
+TEST(PdfExportLimits, ABoxOfOneCharacterLosesNoText)
+{
+    PdfOptions options = pdfOptions(2);
+    const int width = options.page.pageSize.width() * 2540 / int(options.page.resolution);
+    options.page.margins = QMargins(width / 2 - 50, 1000, width / 2 - 50, 1000);
+    const PdfReadBack pdf(pdfBytes(u"AB C\r\nDE\r\n", options));
+    EXPECT_EQ(pdf.pageCount(), 1);
+    EXPECT_EQ(pdf.characters(), QStringLiteral("ABCDE"));
 }
 
 TEST(PdfExportLimits, AReportMayHaveMorePagesThanALibraryListTakes)

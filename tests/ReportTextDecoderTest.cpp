@@ -38,6 +38,9 @@ TEST(ReportTextDecoder, ReadsWhatReportFilesHold)
          QStringLiteral("A\rB\r"), "a CR alone is a character, at the end as well"},
         {"\xEF\xBB\xBF\r\r\r\n", QStringLiteral("\r\r\n"), "a CR before a line end"},
         {"\xEF\xBB\xBF\xC3\xA9\xE2\x88\x9E\xF0\x9F\x98\x80", QString::fromUtf8("é∞😀"), "two, three and four bytes"},
+        {"\xEF\xBB\xBF\xEF\xBB\xBF"
+         "A",
+         QChar(QChar::ByteOrderMark) + QStringLiteral("A"), "a second mark is a character"},
         {"A\nB\n", QStringLiteral("A\r\nB\r\n"), "a text of somebody else"},
         {"A\r\nB", QStringLiteral("A\r\nB"), "the same with CR LF"},
         {QByteArray("a\0b\n", 4), QStringLiteral("a") + QChar(0) + QStringLiteral("b\r\n"), "a NUL is a character"},

@@ -14,14 +14,17 @@
 #include <memory>
 #include <vector>
 
+class QPaintDevice;
 class QPainter;
 class QPrinter;
 class UReportDoc;
 
 namespace kareport
 {
+class LinePager;
 class ReportEdit;
 class ReportViewWidget;
+struct ReportChange;
 
 /// A print job as the view sees it.
 struct PrintInfo
@@ -29,6 +32,9 @@ struct PrintInfo
     QPrinter *printer = nullptr; ///< null until a printer has been prepared
     int curPage = 1;             ///< the page that is printed now, from 1
     int maxPage = 0;             ///< the last page; 0 when there is none
+    bool preview = false;        ///< shown on the screen: nobody is asked for printer and pages
+    /// The printer, where it has been prepared for the job and not been given.
+    std::shared_ptr<QPrinter> ownPrinter;
 };
 } // namespace kareport
 
@@ -63,6 +69,8 @@ public:
     /// Takes over the whole text of the control.
     void OnChange();
     void OnSetFocus();
+    /// A press of the mouse in the control makes the view the active one.
+    void OnMousePress();
     void OnDestroy();
     /// Closes the application, and the report's window with it.
     void OnReportExit();
@@ -81,7 +89,7 @@ public:
     void OnBeginPrinting(QPainter &painter, kareport::PrintInfo &info);
     void OnEndPrinting(QPainter &painter, kareport::PrintInfo &info);
     void OnPrepareDC(QPainter &painter, kareport::PrintInfo &info);
-    /// Prints the page `info.curPage`.
+    /// Prints the page `info.curPage`. Throws std::invalid_argument for a page whose start is not known.
     void OnPrint(QPainter &painter, kareport::PrintInfo &info);
     /// Prints the characters from `start` to `stop` (-1: to the end) as far as they fit a page.
     /// @return the first character that was not printed
@@ -97,13 +105,17 @@ public:
 private:
     void WrapChanged();
     QRect printableRect() const; ///< twips
+    kareport::LinePager makePager(QPaintDevice &device) const;
     std::vector<kareport::Command> makeCommands();
+    void takeEdit(const kareport::ReportChange &change);
+    void followEdit(const kareport::ReportChange &change);
 
     QPointer<QWidget> widget_;
     kareport::ReportEdit *edit_ = nullptr; ///< owned by the widget
     std::vector<kareport::Command> commands_;
     WordWrap m_nWordWrap = WrapNone;
-    QMargins m_rectMargin; ///< twips
-    QSize m_sizePaper;     ///< twips
+    bool isMirrored_ = false; ///< whether the document holds the control's text, its lines ended by CR LF
+    QMargins m_rectMargin;    ///< twips
+    QSize m_sizePaper;        ///< twips
     std::vector<qint64> m_aPageStart;
 };

@@ -4,6 +4,7 @@
 #include "FileBytes.h"
 #include "JobReader.h"
 #include "JobRunner.h"
+#include "LineEndings.h"
 #include "OutputsWriter.h"
 #include "PageHeader.h"
 #include "ReportTextDecoder.h"
@@ -57,7 +58,7 @@ std::optional<InputError> readRichText(const QString &path, QByteArrayView bytes
     if (!saved.text.isEmpty() && !saved.text.endsWith(u'\n')) {
         saved.text += u'\n'; // the last paragraph is a line as well
     }
-    saved.text.replace(u'\n', QStringLiteral("\r\n"));
+    saved.text = withCrLf(saved.text);
     saved.warnings = notes.texts();
     return std::nullopt;
 }

@@ -63,4 +63,9 @@ bool isInterrupted()
     return interrupted != 0;
 }
 
+void setInterrupted(bool isSet)
+{
+    interrupted = isSet ? 1 : 0;
+}
+
 } // namespace kareport

@@ -1,15 +1,10 @@
 #include "JobRunner.h"
 
-#include "ApplicationTitle.h"
-#include "Clock.h"
 #include "CsvObjectList.h"
 #include "Folders.h"
 #include "Interrupt.h"
 #include "JsonObjectList.h"
-#include "Preferences.h"
-#include "Profile.h"
 #include "ReportEntry.h"
-#include "ReportMargins.h"
 #include "TemplateCheck.h"
 #include "TemplateSource.h"
 #include "Xlate.h"
@@ -22,19 +17,6 @@
 
 namespace kareport
 {
-
-namespace
-{
-
-/// The time that a reproducible build gives its programs, if one does.
-std::optional<QDateTime> buildTime()
-{
-    bool isNumber = false;
-    const qint64 seconds = qEnvironmentVariable("SOURCE_DATE_EPOCH").toLongLong(&isNumber);
-    return isNumber ? std::optional(QDateTime::fromSecsSinceEpoch(seconds, Qt::UTC)) : std::nullopt;
-}
-
-} // namespace
 
 /// Carries out the steps of a job, one after the other.
 class JobRunner::Steps
@@ -214,9 +196,13 @@ private:
 };
 
 JobRunner::JobRunner(const Job &job, JsonSource &source, Progress &progress)
-    : job_(job), source_(source), progress_(progress)
+    : job_(job), source_(source), progress_(progress), surroundings_(job)
 {
-    application_.AddDocTemplate(ReportInitialTemplate());
+    // In a program with windows the report belongs to it.
+    if (UApplication::Get() == nullptr) {
+        application_.emplace();
+        application_->AddDocTemplate(ReportInitialTemplate());
+    }
 }
 
 JobRunner::~JobRunner() = default;
@@ -231,21 +217,6 @@ std::optional<InputError> JobRunner::run()
 
 std::optional<InputError> JobRunner::prepare()
 {
-    // What is printed must not depend on the preferences of whoever runs the job.
-    setProfileStore(makeMemoryProfile());
-    WriteProfileString(QString(), QStringLiteral("ReportPrintHash"),
-                       job_.options.printHash ? QStringLiteral("1") : QStringLiteral("0"));
-    if (job_.page.margins) {
-        WriteProfileString(QString(), QStringLiteral("Report Margins"), marginsToText(*job_.page.margins));
-    }
-    if (job_.page.fontSize) {
-        SetReportFontSize(static_cast<unsigned>(*job_.page.fontSize));
-    }
-    SetReportPrinterToPortrait(job_.page.portrait);
-    setStartPathName(job_.folder);
-    SetApplicationTitle(job_.application);
-    fixTime(job_.now ? job_.now : buildTime());
-
     // No page is measured before the face is known.
     setDefaultPrinter({PrinterSource::None});
     report_ = CreateReport(job_.title.value_or(QString()), job_.header, false, nullptr, 0, nullptr);

@@ -2,17 +2,19 @@
 
 #include "InputError.h"
 #include "Job.h"
+#include "JobSurroundings.h"
 #include "JsonNode.h"
 #include "Progress.h"
 #include "UApplication.h"
 #include "UReportDoc.h"
 
 #include <memory>
+#include <optional>
 
 namespace kareport
 {
 
-/// Makes the report that a job describes.
+/// Makes the report that a job describes: in the application where there is one, else without windows.
 class JobRunner
 {
 public:
@@ -26,6 +28,8 @@ public:
     /// @return what is wrong with the job's template or data; nothing when the report has been made or was interrupted
     std::optional<InputError> run();
     UReportDoc &report() { return *report_; }
+    /// The same while it may not have been made: null then.
+    UReportDoc *madeReport() { return report_; }
 
 private:
     class Steps;
@@ -37,8 +41,9 @@ private:
     const Job &job_;
     JsonSource &source_;
     Progress &progress_;
-    UApplication application_;
-    UReportDoc *report_ = nullptr; ///< owned by its document template
+    JobSurroundings surroundings_;
+    std::optional<UApplication> application_; ///< of a program that has none
+    UReportDoc *report_ = nullptr;            ///< owned by its document template
 };
 
 } // namespace kareport

@@ -16,6 +16,7 @@ void Progress::begin(const QString &what, std::size_t total)
     what_ = what;
     total_ = total;
     if (shown_) {
+        sinceShown_.start();
         show(0);
     }
 }
@@ -23,6 +24,7 @@ void Progress::begin(const QString &what, std::size_t total)
 void Progress::advance(std::size_t done)
 {
     if (shown_ && sinceShown_.elapsed() >= millisecondsBetween) {
+        sinceShown_.start();
         show(done);
     }
 }
@@ -35,7 +37,6 @@ void Progress::advance(std::size_t done, std::size_t total)
 
 void Progress::show(std::size_t done)
 {
-    sinceShown_.start();
     QString line = what_;
     if (total_ > 0) {
         line += QStringLiteral(" %1 %").arg(std::min(done, total_) * 100 / total_);

@@ -8,12 +8,12 @@
 namespace kareport
 {
 
-/// Shows on standard error how far long work has come.
+/// Shows how far long work has come: on standard error, unless something else does.
 class Progress
 {
 public:
     explicit Progress(bool shown) : shown_(shown) {}
-    ~Progress() { finish(); }
+    virtual ~Progress() { Progress::finish(); }
     Progress(const Progress &) = delete;
     Progress &operator=(const Progress &) = delete;
 
@@ -24,11 +24,14 @@ public:
     /// The same for work whose amount shows only on the way.
     void advance(std::size_t done, std::size_t total);
     /// Takes the line off the screen.
-    void finish();
+    virtual void finish();
+
+protected:
+    virtual void show(std::size_t done);
+    const QString &what() const { return what_; }
+    std::size_t total() const { return total_; }
 
 private:
-    void show(std::size_t done);
-
     bool shown_;
     QString what_;
     std::size_t total_ = 0;

@@ -11,11 +11,17 @@ kareport::MessageHandler &messageHandler()
     return handler;
 }
 
+kareport::MessageBox &messageBox()
+{
+    static kareport::MessageBox box;
+    return box;
+}
+
 } // namespace
 
 MessageAnswer AppMessageBox(const QString &text, MessageButtons buttons)
 {
-    return messageHandler() ? messageHandler()(text, buttons) : MessageAnswer::Cancel;
+    return kareport::showMessage({text, QString(), buttons, kareport::MessageIcon::None});
 }
 
 MessageAnswer AppMessageBox(unsigned number, unsigned /*type*/, unsigned /*help*/)
@@ -26,4 +32,17 @@ MessageAnswer AppMessageBox(unsigned number, unsigned /*type*/, unsigned /*help*
 void kareport::setMessageHandler(MessageHandler handler)
 {
     messageHandler() = std::move(handler);
+}
+
+MessageAnswer kareport::showMessage(const Message &message)
+{
+    if (messageBox()) {
+        return messageBox()(message);
+    }
+    return messageHandler() ? messageHandler()(message.text, message.buttons) : MessageAnswer::Cancel;
+}
+
+void kareport::setMessageBox(MessageBox box)
+{
+    messageBox() = std::move(box);
 }

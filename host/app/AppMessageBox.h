@@ -30,6 +30,30 @@ KAREPORT_EXPORT MessageAnswer AppMessageBox(unsigned number, unsigned type, unsi
 namespace kareport
 {
 
+enum class MessageIcon
+{
+    None,
+    Information,
+    Question
+};
+
+/// A message with all that can be said about its box.
+struct Message
+{
+    QString text;
+    QString caption; ///< empty for the application's name
+    MessageButtons buttons = MessageButtons::Ok;
+    MessageIcon icon = MessageIcon::None;
+};
+
+/// Shows a message through what `setMessageBox` installed, else through the host's message handler.
+KAREPORT_EXPORT MessageAnswer showMessage(const Message &message);
+
+using MessageBox = std::function<MessageAnswer(const Message &message)>;
+
+/// Installs what shows messages with captions and icons; an empty one takes it away again.
+KAREPORT_EXPORT void setMessageBox(MessageBox box);
+
 using MessageHandler = std::function<MessageAnswer(const QString &text, MessageButtons buttons)>;
 
 /// Installs what shows messages; an empty handler shows nothing again.

@@ -31,6 +31,7 @@ struct DefaultPrinter
     PrinterSource source = PrinterSource::SystemOrBuiltIn;
     PaperSize paper = PaperSize::ByLocale; ///< of the built-in page device
     int resolution = 600;                  ///< of the built-in page device, dots per inch
+    QString name = QString(); ///< of the installed printer that the user has selected; empty for the system's
 };
 
 KAREPORT_EXPORT const DefaultPrinter &defaultPrinter();

@@ -3,6 +3,8 @@
 #include <QHash>
 #include <QSettings>
 
+#include <utility>
+
 namespace kareport
 {
 
@@ -88,6 +90,11 @@ std::unique_ptr<ProfileStore> makeMemoryProfile()
 void setProfileStore(std::unique_ptr<ProfileStore> store)
 {
     currentStore() = std::move(store);
+}
+
+std::unique_ptr<ProfileStore> exchangeProfileStore(std::unique_ptr<ProfileStore> store)
+{
+    return std::exchange(currentStore(), std::move(store));
 }
 
 } // namespace kareport

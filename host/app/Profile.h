@@ -32,5 +32,7 @@ KAREPORT_EXPORT std::unique_ptr<ProfileStore> makeMemoryProfile();
 
 /// The store that the functions above work on; null goes back to the platform's settings store.
 KAREPORT_EXPORT void setProfileStore(std::unique_ptr<ProfileStore> store);
+/// The same. @return the store before, which may be null
+KAREPORT_EXPORT std::unique_ptr<ProfileStore> exchangeProfileStore(std::unique_ptr<ProfileStore> store);
 
 } // namespace kareport

@@ -1,0 +1,12 @@
+#pragma once
+
+#include "UApplication.h"
+
+/// The desktop program: its files last used are kept in the user's profile.
+class DeskApplication : public UApplication
+{
+public:
+    DeskApplication();
+
+    void AddToRecentFileList(const QString &path) override;
+};

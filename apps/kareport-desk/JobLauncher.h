@@ -1,0 +1,16 @@
+#pragma once
+
+#include <QString>
+
+class QWidget;
+class UReportDoc;
+
+namespace kareport
+{
+
+/// Runs a job file in the application, with a window that shows progress and can stop it.
+/// @param error  receives what went wrong; empty when the job was stopped
+/// @return the report, shown in its pane; null when it was not made
+UReportDoc *launchJob(const QString &path, QWidget *parent, QString &error);
+
+} // namespace kareport

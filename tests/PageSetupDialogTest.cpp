@@ -1,0 +1,213 @@
+#include "PageSetupDialog.h"
+
+#include "PrintDialogs.h"
+#include "PrintQt.h"
+
+#include <QComboBox>
+#include <QDialogButtonBox>
+#include <QDoubleSpinBox>
+#include <QLabel>
+#include <QPushButton>
+#include <QRadioButton>
+#include <QTest>
+#include <QTimer>
+
+#include <gtest/gtest.h>
+
+#include <memory>
+
+namespace
+{
+
+using kareport::PageSetup;
+using kareport::PageSetupDialog;
+
+PageSetup usualSetup()
+{
+    PageSetup setup;
+    setup.margins = QMargins(1000, 1001, 1200, 2000);
+    setup.sheetOf = [](const QString &printer) {
+        return printer == QStringLiteral("Large") ? QSizeF(297, 420) : QSizeF(210, 297);
+    };
+    return setup;
+}
+
+QDoubleSpinBox *field(const PageSetupDialog &dialog, const char *name)
+{
+    for (auto *box : dialog.findChildren<QDoubleSpinBox *>()) {
+        if (box->accessibleName() == QString::fromUtf8(name)) {
+            return box;
+        }
+    }
+    return nullptr;
+}
+
+QRadioButton *choice(const PageSetupDialog &dialog, const char *text)
+{
+    for (auto *button : dialog.findChildren<QRadioButton *>()) {
+        if (button->text() == QString::fromUtf8(text)) {
+            return button;
+        }
+    }
+    return nullptr;
+}
+
+void press(PageSetupDialog &dialog, QDialogButtonBox::StandardButton button)
+{
+    QTest::mouseClick(dialog.findChild<QDialogButtonBox *>()->button(button), Qt::LeftButton);
+}
+
+TEST(PageSetupDialog, ShowsMillimetresAndKeepsHundredths)
+{
+    PageSetupDialog dialog(usualSetup());
+    EXPECT_EQ(field(dialog, "Left margin")->value(), 10.0);
+    EXPECT_EQ(field(dialog, "Top margin")->value(), 10.01);
+    EXPECT_EQ(field(dialog, "Right margin")->value(), 12.0);
+    EXPECT_EQ(field(dialog, "Bottom margin")->value(), 20.0);
+    EXPECT_EQ(field(dialog, "Top margin")->cleanText(), QLocale().toString(10.01, 'f', 2)) << "two decimals, no inch";
+    EXPECT_EQ(dialog.setup().margins, usualSetup().margins) << "nothing is lost by looking";
+    for (int hundredths = 0; hundredths < 3000; ++hundredths) {
+        field(dialog, "Left margin")->setValue(hundredths / 100.0);
+        ASSERT_EQ(dialog.setup().margins.left(), hundredths);
+    }
+}
+
+TEST(PageSetupDialog, IsWorkedWithTheKeyboardAlone)
+{
+    PageSetupDialog dialog(usualSetup());
+    dialog.show();
+    ASSERT_TRUE(QTest::qWaitForWindowExposed(&dialog));
+    EXPECT_EQ(dialog.focusWidget(), field(dialog, "Left margin"));
+    const QString point = QLocale().decimalPoint();
+    QTest::keyClicks(dialog.focusWidget(), QStringLiteral("15") + point + QStringLiteral("25"));
+    for (const char *next : {"Right margin", "Top margin", "Bottom margin"}) {
+        QTest::keyClick(dialog.focusWidget(), Qt::Key_Tab);
+        EXPECT_EQ(dialog.focusWidget(), field(dialog, next)) << next;
+    }
+    QTest::keyClicks(dialog.focusWidget(), QStringLiteral("30"));
+    choice(dialog, "L&andscape")->setFocus();
+    QTest::keyClick(dialog.focusWidget(), Qt::Key_Space);
+    QTest::keyClick(&dialog, Qt::Key_Return);
+    EXPECT_EQ(dialog.result(), QDialog::Accepted);
+    EXPECT_EQ(dialog.setup().margins, QMargins(1525, 1001, 1200, 3000));
+    EXPECT_FALSE(dialog.setup().portrait);
+}
+
+TEST(PageSetupDialog, EveryFieldIsReachedByALetterOfItsLabel)
+{
+    PageSetup setup = usualSetup();
+    setup.printers = {QStringLiteral("Small"), QStringLiteral("Large")};
+    const PageSetupDialog dialog(setup);
+    QString letters;
+    int buddies = 0;
+    for (const auto *label : dialog.findChildren<QLabel *>()) {
+        const qsizetype mark = label->text().indexOf(u'&');
+        if (mark >= 0) {
+            letters += label->text()[mark + 1].toUpper();
+            buddies += label->buddy() != nullptr ? 1 : 0;
+        }
+    }
+    for (const auto *button : dialog.findChildren<QRadioButton *>()) {
+        letters += button->text()[button->text().indexOf(u'&') + 1].toUpper();
+    }
+    EXPECT_EQ(buddies, 5);
+    EXPECT_EQ(letters.size(), 7);
+    for (const QChar letter : letters) {
+        EXPECT_EQ(letters.count(letter), 1) << QString(letter).toStdString();
+    }
+}
+
+TEST(PageSetupDialog, RefusesMarginsThatLeaveNoRoomAndSaysSo)
+{
+    struct Row
+    {
+        QMargins margins;
+        bool portrait;
+        bool taken;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {{1000, 1000, 1200, 2000}, true, true, "the usual"},
+        {{0, 0, 0, 0}, true, true, "none"},
+        {{10000, 0, 10000, 0}, true, true, "10 mm are left"},
+        {{10000, 0, 10010, 0}, true, false, "a tenth of a millimetre less"},
+        {{15000, 0, 10000, 0}, true, false, "wider than the paper"},
+        {{15000, 0, 10000, 0}, false, true, "but not than the paper that lies"},
+        {{0, 15000, 0, 14000}, true, false, "7 mm high"},
+        {{0, 10000, 0, 10100}, false, false, "the paper that lies is 210 mm high"},
+    };
+    for (const Row &row : rows) {
+        PageSetup setup = usualSetup();
+        setup.margins = row.margins;
+        setup.portrait = row.portrait;
+        PageSetupDialog dialog(setup);
+        dialog.show();
+        const auto *warning = dialog.findChild<QLabel *>(QStringLiteral("warning"));
+        EXPECT_FALSE(warning->isVisible()) << row.reason;
+        press(dialog, QDialogButtonBox::Ok);
+        EXPECT_EQ(dialog.result() == QDialog::Accepted, row.taken) << row.reason;
+        EXPECT_EQ(dialog.isVisible(), !row.taken) << row.reason;
+        if (!row.taken) {
+            EXPECT_TRUE(warning->isVisible()) << row.reason;
+            EXPECT_TRUE(warning->text().contains(QStringLiteral("no room"))) << row.reason;
+            for (const char *name : {"Left margin", "Top margin", "Right margin", "Bottom margin"}) {
+                field(dialog, name)->setValue(10);
+            }
+            EXPECT_FALSE(warning->isVisible()) << "taken back when it is no longer true; " << row.reason;
+            press(dialog, QDialogButtonBox::Ok);
+            EXPECT_EQ(dialog.result(), QDialog::Accepted) << row.reason;
+        }
+    }
+}
+
+TEST(PageSetupDialog, OffersPrintersWhereThereAreSeveral)
+{
+    struct Row
+    {
+        QStringList printers;
+        bool shown;
+        const char *reason;
+    };
+    const QString small = QStringLiteral("Small");
+    const QString large = QStringLiteral("Large");
+    for (const Row &row : {Row{{}, false, "none is installed"}, Row{{small}, false, "there is nothing to choose"},
+                           Row{{small, large}, true, "two"}})
+    {
+        PageSetup setup = usualSetup();
+        setup.printer = row.printers.value(0);
+        setup.printers = row.printers;
+        PageSetupDialog dialog(setup);
+        dialog.show();
+        EXPECT_EQ(dialog.findChild<QComboBox *>()->isVisible(), row.shown) << row.reason;
+        EXPECT_EQ(dialog.setup().printer, row.printers.value(0)) << row.reason;
+    }
+
+    PageSetup setup = usualSetup();
+    setup.printers = {small, large};
+    setup.printer = small;
+    setup.margins = QMargins(15000, 0, 10000, 0);
+    PageSetupDialog dialog(setup);
+    dialog.show();
+    press(dialog, QDialogButtonBox::Ok);
+    EXPECT_TRUE(dialog.isVisible()) << "no room on the sheet of the small one";
+    dialog.findChild<QComboBox *>()->setCurrentText(large);
+    press(dialog, QDialogButtonBox::Ok);
+    EXPECT_EQ(dialog.result(), QDialog::Accepted);
+    EXPECT_EQ(dialog.setup().printer, large);
+}
+
+TEST(PageSetupDialog, CancelLeavesTheSetupThatWasGiven)
+{
+    kareport::setPrintDialogs({});
+    PageSetup setup = usualSetup();
+    QTimer::singleShot(0, qApp, [] {
+        auto *dialog = dynamic_cast<PageSetupDialog *>(QApplication::activeModalWidget());
+        ASSERT_NE(dialog, nullptr);
+        field(*dialog, "Left margin")->setValue(33);
+        QTest::keyClick(dialog, Qt::Key_Escape);
+    });
+    EXPECT_FALSE(kareport::askPageSetup(setup, nullptr));
+    EXPECT_EQ(setup.margins, usualSetup().margins);
+}
+
+} // namespace

@@ -1,0 +1,268 @@
+#include "ReportEdit.h"
+
+#include "PrintQt.h"
+
+#include <QMimeData>
+#include <QScrollBar>
+#include <QTest>
+#include <QTextBlock>
+#include <QTextDocument>
+#include <QTextLayout>
+#include <QWheelEvent>
+
+#include <gtest/gtest.h>
+
+namespace
+{
+
+using kareport::ReportChange;
+using kareport::ReportEdit;
+
+/// A control that keeps what it was told of edits.
+struct Edited
+{
+    explicit Edited(const QString &text)
+    {
+        edit.loadPlainText(text);
+        edit.setEditHandler([this](const ReportChange &change) { changes.push_back(change); });
+    }
+    void replace(int position, int removed, const QString &inserted)
+    {
+        QTextCursor cursor(edit.document());
+        cursor.setPosition(position);
+        cursor.setPosition(position + removed, QTextCursor::KeepAnchor);
+        cursor.insertText(inserted);
+    }
+
+    ReportEdit edit;
+    std::vector<ReportChange> changes;
+};
+
+TEST(ReportEdit, TellsOfAnEditWhatItIs)
+{
+    struct Row
+    {
+        int position;
+        int removed;
+        const char16_t *inserted;
+        qint64 at;
+        qint64 gone;
+        const char16_t *added;
+        const char *reason;
+    };
+    // The text is "ab\ncd\n", in the document "ab\r\ncd\r\n".
+    constexpr Row rows[] = {
+        {0, 0, u"x", 0, 0, u"x", "before everything"},
+        {6, 0, u"x", 8, 0, u"x", "behind everything: two line ends before it"},
+        {2, 1, u"", 2, 2, u"", "a line end is two characters"},
+        {3, 0, u"x", 4, 0, u"x", "in the second line"},
+        {1, 3, u"\n", 1, 4, u"\r\n", "across a line end, by a line end"},
+        {0, 6, u"", 0, 8, u"", "everything goes"},
+        {0, 6, u"1\n2\n3\n", 0, 8, u"1\r\n2\r\n3\r\n", "everything is replaced"},
+        {5, 1, u"", 6, 2, u"", "the last line end"},
+    };
+    for (const Row &row : rows) {
+        Edited t(QStringLiteral("ab\ncd\n"));
+        t.replace(row.position, row.removed, QString::fromUtf16(row.inserted));
+        ASSERT_EQ(t.changes.size(), 1U) << row.reason;
+        EXPECT_EQ(t.changes[0].documentPosition(), row.at) << row.reason;
+        EXPECT_EQ(t.changes[0].documentRemoved(), row.gone) << row.reason;
+        EXPECT_EQ(t.changes[0].documentInserted(), QString::fromUtf16(row.added)) << row.reason;
+        EXPECT_EQ(t.changes[0].documentLengthBefore(), 8) << row.reason;
+    }
+}
+
+TEST(ReportEdit, ATextThatIsSetFromOutsideIsAnEditOfEverything)
+{
+    for (const char16_t *text : {u"", u"x", u"x\ny\n", u"ab\ncd\n"}) {
+        Edited t(QStringLiteral("ab\ncd\n"));
+        QString document = QStringLiteral("ab\r\ncd\r\n");
+        t.edit.setPlainText(QString::fromUtf16(text));
+        for (const ReportChange &change : t.changes) {
+            EXPECT_EQ(change.documentLengthBefore(), document.size());
+            document.replace(change.documentPosition(), change.documentRemoved(), change.documentInserted());
+        }
+        EXPECT_EQ(document, t.edit.windowText()) << "the changes, one after the other";
+        EXPECT_EQ(t.edit.toPlainText(), QString::fromUtf16(text));
+    }
+}
+
+TEST(ReportEdit, AFormatOfTheLastParagraphReachesNoFurtherThanTheText)
+{
+    Edited t(QStringLiteral("ab\ncd"));
+    QTextBlockFormat indented;
+    indented.setIndent(1);
+    QTextCursor(t.edit.document()->lastBlock()).setBlockFormat(indented);
+    for (const ReportChange &change : t.changes) {
+        EXPECT_LE(change.position + change.removed, 5) << "the end of the last paragraph is no character";
+        EXPECT_EQ(change.documentInserted().size(), change.documentRemoved());
+    }
+    EXPECT_EQ(t.edit.windowText(), QStringLiteral("ab\r\ncd"));
+}
+
+TEST(ReportEdit, LoadingAndFollowingAreNoEditsAndCannotBeUndone)
+{
+    Edited t(QStringLiteral("one"));
+    Edited source(QStringLiteral("one"));
+    source.replace(3, 0, QStringLiteral("\ntwo"));
+    ASSERT_EQ(source.changes.size(), 1U);
+    EXPECT_TRUE(t.edit.applyChange(source.changes[0]));
+    EXPECT_EQ(t.edit.windowText(), QStringLiteral("one\r\ntwo"));
+    EXPECT_FALSE(t.edit.applyChange(source.changes[0])) << "it was made in another text";
+    EXPECT_EQ(t.edit.windowText(), QStringLiteral("one\r\ntwo"));
+    t.edit.loadRichText(u"{\\rtf1 a}");
+    t.edit.loadPlainText(QStringLiteral("b"));
+    EXPECT_TRUE(t.changes.empty());
+    EXPECT_FALSE(t.edit.document()->isUndoAvailable());
+    QTest::keyClick(&t.edit, Qt::Key_X);
+    EXPECT_EQ(t.changes.size(), 1U) << "edits are told of again";
+    EXPECT_TRUE(t.edit.document()->isUndoAvailable());
+}
+
+TEST(ReportEdit, ZoomGoesInStepsAndKeepsItsLimits)
+{
+    struct Row
+    {
+        int percent;
+        int direction;
+        int expected;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {100, 1, 110, "up"},          {100, -1, 90, "down"},         {500, 1, 500, "the largest"},
+        {25, -1, 25, "the smallest"}, {120, 1, 125, "from between"}, {120, -1, 110, "from between, down"},
+        {1, 0, 25, "too small"},      {100000, 0, 500, "too large"}, {-5, 0, 25, "less than nothing"},
+    };
+    for (const Row &row : rows) {
+        ReportEdit edit;
+        edit.setZoomPercent(row.percent);
+        if (row.direction != 0) {
+            edit.zoomStep(row.direction);
+        }
+        EXPECT_EQ(edit.zoomPercent(), row.expected) << row.reason;
+    }
+}
+
+TEST(ReportEdit, ZoomsByKeysAndWheel)
+{
+    ReportEdit edit;
+    int told = 0;
+    edit.setZoomHandler([&told] { ++told; });
+    QTest::keyClick(&edit, Qt::Key_Plus, Qt::ControlModifier);
+    EXPECT_EQ(edit.zoomPercent(), 110);
+    QTest::keyClick(&edit, Qt::Key_Equal, Qt::ControlModifier);
+    EXPECT_EQ(edit.zoomPercent(), 125) << "where plus needs the shift key";
+    QTest::keyClick(&edit, Qt::Key_Minus, Qt::ControlModifier | Qt::KeypadModifier);
+    EXPECT_EQ(edit.zoomPercent(), 110);
+    QTest::keyClick(&edit, Qt::Key_0, Qt::ControlModifier);
+    EXPECT_EQ(edit.zoomPercent(), 100);
+    EXPECT_EQ(told, 4);
+    QTest::keyClick(&edit, Qt::Key_Plus);
+    EXPECT_EQ(edit.toPlainText(), QStringLiteral("+")) << "without the control key it is a character";
+
+    const auto turn = [&edit](int eighths, Qt::KeyboardModifiers modifiers) {
+        QWheelEvent event({5, 5}, edit.mapToGlobal(QPointF(5, 5)), {}, {0, eighths}, Qt::NoButton, modifiers,
+                          Qt::NoScrollPhase, false);
+        QCoreApplication::sendEvent(edit.viewport(), &event);
+    };
+    turn(120, Qt::NoModifier);
+    EXPECT_EQ(edit.zoomPercent(), 100) << "scrolls";
+    turn(240, Qt::ControlModifier);
+    EXPECT_EQ(edit.zoomPercent(), 125) << "two steps";
+    turn(-120, Qt::ControlModifier);
+    EXPECT_EQ(edit.zoomPercent(), 110);
+    turn(60, Qt::ControlModifier);
+    EXPECT_EQ(edit.zoomPercent(), 110) << "half a step";
+    turn(60, Qt::ControlModifier);
+    EXPECT_EQ(edit.zoomPercent(), 125) << "and the other half";
+}
+
+TEST(ReportEdit, ZoomScalesEveryFontAndChangesNone)
+{
+    ReportEdit edit;
+    edit.setReportFont(QFont(QStringLiteral("DejaVu Sans Mono"), 10));
+    edit.resize(600, 400);
+    edit.show();
+    edit.loadRichText(u"{\\rtf1 \\fs16 small\\par \\fs40 large\\par}");
+    const auto heightOf = [&edit](int block) {
+        const QTextBlock shown = edit.document()->findBlockByNumber(block);
+        edit.document()->documentLayout()->blockBoundingRect(shown);
+        return shown.layout()->boundingRect().height();
+    };
+    const double small = heightOf(0);
+    const double large = heightOf(1);
+    EXPECT_GT(large, small * 2);
+    edit.setZoomPercent(200);
+    EXPECT_NEAR(heightOf(0), small * 2, 2);
+    EXPECT_NEAR(heightOf(1), large * 2, 2);
+    EXPECT_DOUBLE_EQ(QTextCursor(edit.document()->firstBlock()).block().begin().fragment().charFormat().fontPointSize(),
+                     8);
+    edit.setZoomPercent(100);
+    EXPECT_NEAR(heightOf(0), small, 0.01);
+    EXPECT_NEAR(heightOf(1), large, 0.01);
+}
+
+TEST(ReportEdit, ZoomHoldsForWhatIsLoadedLater)
+{
+    ReportEdit edit;
+    edit.resize(600, 400);
+    edit.show();
+    const auto height = [&edit] {
+        edit.document()->documentLayout()->blockBoundingRect(edit.document()->firstBlock());
+        return edit.document()->firstBlock().layout()->boundingRect().height();
+    };
+    edit.loadPlainText(QStringLiteral("x"));
+    const double before = height();
+    edit.setZoomPercent(300);
+    edit.loadPlainText(QStringLiteral("y"));
+    EXPECT_NEAR(height(), before * 3, 3);
+}
+
+TEST(ReportEdit, RichTextIsShownOnPaper)
+{
+    ReportEdit edit;
+    QPalette dark;
+    dark.setColor(QPalette::Base, Qt::black);
+    dark.setColor(QPalette::Text, Qt::white);
+    QWidget window;
+    window.setPalette(dark);
+    edit.setParent(&window);
+    edit.loadPlainText(QStringLiteral("a"));
+    EXPECT_EQ(edit.palette().color(QPalette::Base), QColor(Qt::black)) << "plain text follows the desktop";
+    edit.loadRichText(u"{\\rtf1 a}");
+    EXPECT_EQ(edit.palette().color(QPalette::Base), QColor(Qt::white));
+    EXPECT_EQ(edit.palette().color(QPalette::Text), QColor(Qt::black));
+    edit.loadPlainText(QStringLiteral("a"));
+    EXPECT_EQ(edit.palette().color(QPalette::Text), QColor(Qt::white));
+    edit.setParent(nullptr);
+}
+
+TEST(ReportEdit, ATextWithoutCharactersIsPastedAsNothing)
+{
+    Edited t(QStringLiteral("a"));
+    struct Pasting : ReportEdit
+    {
+        using ReportEdit::insertFromMimeData;
+    };
+    Pasting edit;
+    QMimeData picture;
+    picture.setData(QStringLiteral("image/png"), "x");
+    edit.insertFromMimeData(&picture);
+    EXPECT_TRUE(edit.toPlainText().isEmpty());
+    QMimeData text;
+    text.setText(QStringLiteral("t"));
+    edit.setReadOnly(true);
+    edit.insertFromMimeData(&text);
+    EXPECT_TRUE(edit.toPlainText().isEmpty()) << "read only";
+}
+
+TEST(ReportEdit, WrongRichTextShowsWhatWasReadUpToThere)
+{
+    ReportEdit edit;
+    const auto error = edit.loadRichText(u"{\\rtf1 some{");
+    ASSERT_TRUE(error.has_value());
+    EXPECT_TRUE(edit.toPlainText().startsWith(QStringLiteral("some")));
+    EXPECT_FALSE(edit.accessibleName().isEmpty());
+}
+
+} // namespace

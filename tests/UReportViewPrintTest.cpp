@@ -1,0 +1,309 @@
+#include "UReportView.h"
+
+#include "PrintFixture.h"
+
+#include <QFile>
+
+#include <gmock/gmock.h>
+
+#include <stdexcept>
+
+namespace
+{
+
+using kareport::PrintInfo;
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+/// A view whose page has been prepared for a printer into a file, without a window.
+class PreparedView
+{
+public:
+    explicit PreparedView(int lines)
+    {
+        report.report.FixPage(72, 80);
+        report.report.SetPageSize();
+        writeLines(report.report, lines);
+        view = &report.open();
+        printer.setOutputFormat(QPrinter::PdfFormat);
+        printer.setOutputFileName(printing.file());
+        printer.setResolution(600);
+        printer.setPageSize(QPageSize(QPageSize::A4));
+        printer.setFullPage(true);
+        info.printer = &printer;
+        EXPECT_TRUE(view->OnPreparePrinting(info));
+    }
+
+    AnsweredPrinting printing;
+    ShownReport report;
+    UReportView *view;
+    QPrinter printer{QPrinter::HighResolution};
+    PrintInfo info;
+};
+
+TEST(UReportViewPrint, PreparingSetsPaperMarginsAndPages)
+{
+    struct Row
+    {
+        int lines;
+        int pages;
+        const char *reason;
+    };
+    for (const Row &row : {Row{0, 0, "nothing"}, Row{1, 1, "a line"}, Row{72, 1, "a page"}, Row{73, 2, "a line more"}})
+    {
+        const PreparedView prepared(row.lines);
+        EXPECT_EQ(prepared.info.maxPage, row.pages) << row.reason;
+        EXPECT_THAT(prepared.printing.maxPages, ElementsAre(row.pages)) << "offered to the user; " << row.reason;
+        EXPECT_EQ(prepared.view->GetPrintMargins(), QMargins(567, 567, 680, 1134)) << row.reason;
+        EXPECT_EQ(prepared.view->GetPaperSize(), QSize(11906, 16838)) << "A4; " << row.reason;
+        EXPECT_EQ(prepared.info.printer, &prepared.printer) << "a printer that is there is kept; " << row.reason;
+    }
+}
+
+TEST(UReportViewPrint, ThePageStartTableGrowsByThePagesThatArePrinted)
+{
+    PreparedView prepared(200);
+    UReportView &view = *prepared.view;
+    PrintInfo &info = prepared.info;
+    QPainter painter(&prepared.printer);
+    view.OnBeginPrinting(painter, info);
+    EXPECT_THAT(view.GetPageStarts(), ElementsAre(0));
+    EXPECT_EQ(info.maxPage, 3);
+
+    view.OnPrint(painter, info);
+    ASSERT_EQ(view.GetPageStarts().size(), 2U) << "the start of page 2";
+    const qint64 second = view.GetPageStarts()[1];
+    EXPECT_EQ(view.PrintPage(painter, 0, -1), second);
+    EXPECT_EQ(info.maxPage, 3) << "more text follows";
+
+    view.OnPrint(painter, info);
+    EXPECT_THAT(view.GetPageStarts(), ElementsAre(0, second)) << "a page out of order adds nothing";
+    info.curPage = 2;
+    view.OnPrint(painter, info);
+    ASSERT_EQ(view.GetPageStarts().size(), 3U);
+
+    info.curPage = 3;
+    info.maxPage = 9;
+    view.OnPrint(painter, info);
+    EXPECT_EQ(info.maxPage, 3) << "the text ends inside this page";
+    EXPECT_EQ(view.GetPageStarts().size(), 3U) << "no page behind the last";
+
+    for (const int unknown : {0, -1, 4, 100}) {
+        info.curPage = unknown;
+        EXPECT_THROW(view.OnPrint(painter, info), std::invalid_argument) << unknown;
+    }
+    EXPECT_EQ(info.maxPage, 3);
+    view.OnEndPrinting(painter, info);
+    EXPECT_THAT(view.GetPageStarts(), IsEmpty());
+}
+
+TEST(UReportViewPrint, APageIsFoundBeforeThoseInFrontOfItArePrinted)
+{
+    PreparedView prepared(400);
+    UReportView &view = *prepared.view;
+    QPainter painter(&prepared.printer);
+    view.OnBeginPrinting(painter, prepared.info);
+    prepared.info.curPage = 4;
+    view.OnPrepareDC(painter, prepared.info);
+    EXPECT_EQ(view.GetPageStarts().size(), 4U);
+    prepared.info.curPage = 100;
+    view.OnPrepareDC(painter, prepared.info);
+    EXPECT_EQ(view.GetPageStarts().size(), 5U) << "80 lines a page";
+    EXPECT_EQ(prepared.info.maxPage, 5) << "there is no page 100";
+}
+
+TEST(UReportViewPrint, PrintsAPartOfTheText)
+{
+    PreparedView prepared(10);
+    QPainter painter(&prepared.printer);
+    EXPECT_EQ(prepared.view->PrintPage(painter, 0, 7), 7);
+    EXPECT_EQ(prepared.view->PrintPage(painter, 7, 14), 14);
+    EXPECT_EQ(prepared.view->PrintPage(painter, 0, -1), 71) << "9 lines of 7 characters and one of 8, with their ends";
+    QPainter idle;
+    EXPECT_EQ(prepared.view->PrintPage(idle, 3, -1), 3) << "nothing to paint on";
+}
+
+TEST(UReportViewPrint, PrintsTheWholeReport)
+{
+    struct Row
+    {
+        int lines;
+        int pages;
+        const char *reason;
+    };
+    // 80 lines of 8 points fit the usual page.
+    for (const Row &row :
+         {Row{1, 1, "a line"}, Row{80, 1, "a full page"}, Row{81, 2, "a line more"}, Row{800, 10, "ten pages"}})
+    {
+        const AnsweredPrinting printing;
+        const AnsweredMessages messages(MessageAnswer::Ok);
+        ShownReport report;
+        writeLines(report.report, row.lines);
+        report.open().OnReportPrint();
+        EXPECT_EQ(printing.printedPages(), row.pages) << row.reason;
+        EXPECT_THAT(messages.texts, IsEmpty()) << row.reason;
+    }
+}
+
+TEST(UReportViewPrint, LongLinesTakePagesThatWereNotCounted)
+{
+    const AnsweredPrinting printing;
+    ShownReport report;
+    report.report.SetHeaderFlag(false);
+    for (int i = 0; i < 60; ++i) {
+        report.report.Write(QString(300, u'x') + QStringLiteral("\r\n"), 0);
+    }
+    report.open().OnReportPrint();
+    EXPECT_THAT(printing.maxPages, ElementsAre(1));
+    EXPECT_EQ(printing.printedPages(), 3) << "180 rows: nothing is lost";
+}
+
+TEST(UReportViewPrint, PrintingUsesTheReportsOrientationAndPutsTheModulesBack)
+{
+    for (const bool reportPortrait : {true, false}) {
+        for (const bool modulePortrait : {true, false}) {
+            for (const bool accept : {true, false}) {
+                AnsweredPrinting printing;
+                printing.accept = accept;
+                ShownReport report;
+                writeLines(report.report, 3);
+                UReportView &view = report.open();
+                SetReportPrinterToPortrait(reportPortrait);
+                UPreviewDlg::SetModulePrinterOrientationPortrait(modulePortrait);
+                view.OnReportPrint();
+                EXPECT_EQ(printing.portraitMeanwhile, reportPortrait);
+                EXPECT_EQ(printing.orientation, reportPortrait ? QPageLayout::Portrait : QPageLayout::Landscape);
+                EXPECT_EQ(view.GetPaperSize().height() > view.GetPaperSize().width(), reportPortrait)
+                    << "the page model matches the printer";
+                EXPECT_EQ(QFile::exists(printing.file()), accept);
+                EXPECT_EQ(UPreviewDlg::IsModulePrinterOrientationPortrait(), modulePortrait);
+                view.OnReportPrintPreview();
+                EXPECT_EQ(printing.previews, 1);
+                EXPECT_EQ(printing.portraitMeanwhile, reportPortrait);
+                EXPECT_EQ(UPreviewDlg::IsModulePrinterOrientationPortrait(), modulePortrait);
+                EXPECT_EQ(IsReportPrinterSetToPortrait(), reportPortrait) << "never changed by printing";
+            }
+        }
+    }
+}
+
+TEST(UReportViewPrint, ThePreviewAsksForNoPrinterAndShowsEveryPage)
+{
+    const AnsweredPrinting printing;
+    ShownReport report;
+    writeLines(report.report, 200);
+    report.open().OnReportPrintPreview();
+    EXPECT_EQ(printing.previews, 1);
+    EXPECT_EQ(printing.prints, 0);
+    EXPECT_EQ(printing.printedPages(), 3);
+}
+
+TEST(UReportViewPrint, AnotherSheetThatTheUserChoosesIsPrintedOn)
+{
+    AnsweredPrinting printing;
+    printing.changePrinter = [](QPrinter &printer) { printer.setPageSize(QPageSize(QPageSize::A5)); };
+    ShownReport report;
+    writeLines(report.report, 80);
+    report.open().OnReportPrint();
+    EXPECT_EQ(printing.printedPages(), 2) << "210 mm are 53 lines high";
+}
+
+TEST(UReportViewPrint, WithoutAPrinterEveryCommandSaysSo)
+{
+    const AnsweredPrinting printing;
+    ShownReport report;
+    writeLines(report.report, 3);
+    UReportView &view = report.open();
+    kareport::setDefaultPrinter({kareport::PrinterSource::None});
+    UPreviewDlg::SetModulePrinterOrientationPortrait(false);
+    AnsweredMessages messages(MessageAnswer::Ok);
+    view.OnReportPrint();
+    view.OnReportPrintPreview();
+    PrintInfo info;
+    EXPECT_FALSE(view.OnPreparePrinting(info));
+    EXPECT_EQ(info.maxPage, 1) << "counted before the printer is asked for";
+    EXPECT_THAT(messages.texts, testing::Each(QStringLiteral("No Default Printer is Installed!!!")));
+    EXPECT_EQ(messages.texts.size(), 3);
+    messages.texts.clear();
+    view.OnPageSetup();
+    EXPECT_THAT(messages.texts, ElementsAre(QStringLiteral("Failed to get default printer settings.")));
+    EXPECT_EQ(printing.prints + printing.previews, 0);
+    EXPECT_THAT(printing.setups, IsEmpty());
+    EXPECT_FALSE(UPreviewDlg::IsModulePrinterOrientationPortrait()) << "put back";
+}
+
+TEST(UReportViewPrint, MarginsThatLeaveNoRoomAreReportedInsteadOfPrinted)
+{
+    for (const QMargins &margins :
+         {QMargins(11000, 1000, 11000, 1000), QMargins(1000, 15000, 1000, 15000), QMargins(99999999, 0, 0, 0)})
+    {
+        const AnsweredPrinting printing;
+        const AnsweredMessages messages(MessageAnswer::Ok);
+        ShownReport report;
+        writeLines(report.report, 3);
+        report.report.SetMargins(margins);
+        UReportView &view = report.open();
+        view.OnReportPrint();
+        view.OnReportPrintPreview();
+        EXPECT_EQ(messages.texts.size(), 2);
+        EXPECT_TRUE(messages.texts.value(0).contains(QStringLiteral("Page Setup")));
+        EXPECT_EQ(printing.prints + printing.previews, 0);
+    }
+}
+
+TEST(UReportViewPrint, AnEmptyReportPrintsNothingAndSaysSo)
+{
+    const AnsweredPrinting printing;
+    const AnsweredMessages messages(MessageAnswer::Ok);
+    ShownReport report;
+    report.open().OnReportPrint();
+    EXPECT_EQ(messages.texts.size(), 1);
+    EXPECT_FALSE(QFile::exists(printing.file()));
+}
+
+TEST(UReportViewPrint, AFailedJobSaysWhatToDo)
+{
+    AnsweredPrinting printing;
+    printing.changePrinter = [](QPrinter &printer) { printer.setOutputFileName(QStringLiteral("/no/folder/a.pdf")); };
+    const AnsweredMessages messages(MessageAnswer::Ok);
+    ShownReport report;
+    writeLines(report.report, 3);
+    report.open().OnReportPrint();
+    ASSERT_EQ(messages.texts.size(), 1);
+    EXPECT_TRUE(messages.texts[0].contains(QStringLiteral("/no/folder/a.pdf")));
+    EXPECT_TRUE(messages.texts[0].contains(QStringLiteral("print again")));
+}
+
+TEST(UReportViewPrint, AReportThatIsClosedWhileItsWindowAsksIsNotTouched)
+{
+    AnsweredPrinting printing;
+    ShownReport report;
+    writeLines(report.report, 3);
+    UReportView *view = &report.open();
+    printing.changePrinter = [&](QPrinter &) { report.close(0); };
+    view->OnReportPrint();
+    EXPECT_FALSE(QFile::exists(printing.file()));
+    view = &report.open();
+    printing.changeSetup = [&](kareport::PageSetup &setup) {
+        setup.margins = QMargins(1, 2, 3, 4);
+        report.close(0);
+    };
+    view->OnPageSetup();
+    EXPECT_EQ(report.report.GetMargins(), QMargins(1000, 1000, 1200, 2000));
+}
+
+TEST(UReportViewPrint, AViewWithoutAReportPrintsNothing)
+{
+    const AnsweredPrinting printing;
+    const AnsweredMessages messages(MessageAnswer::Ok);
+    UReportView view;
+    view.OnReportPrint();
+    view.OnReportPrintPreview();
+    view.OnPageSetup();
+    PrintInfo info;
+    EXPECT_FALSE(view.OnPreparePrinting(info));
+    EXPECT_EQ(printing.prints + printing.previews, 0);
+    EXPECT_THAT(messages.texts, IsEmpty());
+}
+
+} // namespace

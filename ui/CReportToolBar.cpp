@@ -1,0 +1,65 @@
+#include "CReportToolBar.h"
+
+#include "ReportResources.h"
+#include "Xlate.h"
+
+#include <QAction>
+#include <QContextMenuEvent>
+#include <QToolButton>
+
+CReportToolBar::CReportToolBar(kareport::CommandTarget *owner, QWidget *parent) : QToolBar(parent), owner_(owner)
+{
+    setIconSize(QSize(16, 16));
+    setMovable(false);
+    setFloatable(false);
+    setToolButtonStyle(Qt::ToolButtonIconOnly);
+    setWindowTitle(Xlate("Report"));
+    for (const unsigned id : {kareport::commandSaveReport, kareport::commandShowReport, kareport::commandPrintReport}) {
+        QAction *button = addAction(kareport::reportIcon(id), QString());
+        button->setData(id);
+        QString tip;
+        OnUserToolTip(button, tip);
+        button->setText(tip);
+        button->setToolTip(tip);
+        connect(button, &QAction::triggered, this, [this, id] {
+            if (owner_ != nullptr) {
+                owner_->runCommand(id);
+            }
+        });
+        // A person without a mouse reaches the buttons with the Tab key.
+        widgetForAction(button)->setFocusPolicy(Qt::TabFocus);
+        widgetForAction(button)->setAccessibleName(tip);
+    }
+}
+
+bool CReportToolBar::OnShowControlBarMenu(const QPoint & /*point*/) const
+{
+    return false;
+}
+
+void CReportToolBar::OnUpdateCmdUI(UXTPMDIFrameWnd * /*frame*/, bool /*disableIfNoHandler*/)
+{
+    for (QAction *button : actions()) {
+        kareport::CommandState state;
+        const bool known = owner_ != nullptr && owner_->updateCommand(button->data().toUInt(), state);
+        button->setEnabled(known && state.enabled);
+    }
+}
+
+bool CReportToolBar::OnUserToolTip(const QAction *button, QString &text) const
+{
+    text = Xlate(kareport::reportString(button->data().toUInt()));
+    return true;
+}
+
+void CReportToolBar::contextMenuEvent(QContextMenuEvent *event)
+{
+    // Left unanswered, the event would go to the main frame, which shows a menu of all bars.
+    event->setAccepted(!OnShowControlBarMenu(event->pos()));
+}
+
+void CReportToolBar::showEvent(QShowEvent *event)
+{
+    OnUpdateCmdUI(nullptr, true);
+    QToolBar::showEvent(event);
+}

@@ -1,0 +1,119 @@
+#include "ReportResources.h"
+
+#include <QGuiApplication>
+#include <QIconEngine>
+#include <QPainter>
+#include <QPainterPath>
+#include <QPalette>
+
+#include <functional>
+
+namespace kareport
+{
+
+namespace
+{
+
+/// Icons are drawn on a sheet of 16 units a side.
+constexpr qreal sheet = 16;
+constexpr qreal lineWidth = 1.2;
+
+using Draw = void (*)(QPainter &painter, const QColor &accent);
+
+void drawDisk(QPainter &painter, const QColor &accent)
+{
+    QPainterPath outline;
+    outline.moveTo(2.5, 2.5);
+    outline.lineTo(11.5, 2.5);
+    outline.lineTo(13.5, 4.5);
+    outline.lineTo(13.5, 13.5);
+    outline.lineTo(2.5, 13.5);
+    outline.closeSubpath();
+    painter.drawPath(outline);
+    painter.fillRect(QRectF(5, 3, 5, 3.5), accent);
+    painter.drawRect(QRectF(5, 9, 6, 4.5));
+}
+
+void drawPage(QPainter &painter, const QColor &accent)
+{
+    QPainterPath outline;
+    outline.moveTo(3.5, 1.5);
+    outline.lineTo(9.5, 1.5);
+    outline.lineTo(12.5, 4.5);
+    outline.lineTo(12.5, 14.5);
+    outline.lineTo(3.5, 14.5);
+    outline.closeSubpath();
+    painter.drawPath(outline);
+    painter.drawPolyline(QPolygonF({{9.5, 1.5}, {9.5, 4.5}, {12.5, 4.5}}));
+    painter.setPen(QPen(accent, lineWidth));
+    for (const qreal y : {7.0, 9.5, 12.0}) {
+        painter.drawLine(QPointF(5.5, y), QPointF(10.5, y));
+    }
+}
+
+void drawPrinter(QPainter &painter, const QColor &accent)
+{
+    painter.drawRect(QRectF(4.5, 1.5, 7, 4));
+    painter.drawRoundedRect(QRectF(1.5, 5.5, 13, 6), 1, 1);
+    painter.setBrush(accent);
+    painter.drawRect(QRectF(4.5, 9.5, 7, 5));
+}
+
+Draw drawingOf(unsigned command)
+{
+    switch (command) {
+    case commandSaveReport: return &drawDisk;
+    case commandShowReport: return &drawPage;
+    case commandPrintReport: return &drawPrinter;
+    default: return nullptr;
+    }
+}
+
+class LineIcon : public QIconEngine
+{
+public:
+    explicit LineIcon(Draw draw) : draw_(draw) {}
+
+    void paint(QPainter *painter, const QRect &rect, QIcon::Mode mode, QIcon::State /*state*/) override
+    {
+        const QPalette palette = QGuiApplication::palette();
+        const auto group = mode == QIcon::Disabled ? QPalette::Disabled : QPalette::Active;
+        QColor accent = palette.color(group, QPalette::Highlight);
+        if (mode == QIcon::Disabled) {
+            accent = palette.color(group, QPalette::Mid);
+        }
+        painter->save();
+        painter->setRenderHint(QPainter::Antialiasing);
+        painter->translate(rect.topLeft());
+        painter->scale(rect.width() / sheet, rect.height() / sheet);
+        painter->setPen(
+            QPen(palette.color(group, QPalette::ButtonText), lineWidth, Qt::SolidLine, Qt::RoundCap, Qt::MiterJoin));
+        painter->setBrush(Qt::NoBrush);
+        draw_(*painter, accent);
+        painter->restore();
+    }
+
+    QPixmap pixmap(const QSize &size, QIcon::Mode mode, QIcon::State state) override
+    {
+        QPixmap pixmap(size);
+        pixmap.fill(Qt::transparent);
+        QPainter painter(&pixmap);
+        paint(&painter, QRect(QPoint(), size), mode, state);
+        return pixmap;
+    }
+
+    QIconEngine *clone() const override { return new LineIcon(*this); }
+
+private:
+    Draw draw_;
+};
+
+} // namespace
+
+QIcon reportIcon(unsigned command)
+{
+    const Draw draw = drawingOf(command);
+    return draw != nullptr ? QIcon(new LineIcon(draw)) : QIcon();
+}
+
+} // namespace kareport

@@ -1,0 +1,43 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QRect>
+#include <QtGlobal>
+
+class QPaintDevice;
+class QPainter;
+class QTextDocument;
+
+namespace kareport
+{
+
+/// Lays the lines of a text out in pages and draws them: the one rule for where a page ends, whether pages are counted,
+/// shown or printed.
+///
+/// A line that is wider than the page goes on in the next row. A page takes one row at least, however high it is.
+class KAREPORT_EXPORT LinePager
+{
+public:
+    /// Text and device must outlive the pager.
+    LinePager(const QTextDocument &text, QPaintDevice &device);
+
+    /// The lines that the pages of the text were written for. Where a page measured in twips has them but for a rounding,
+    /// or one more by a rounding, it takes just as many.
+    void setUsualLines(int lines) { usualLines_ = lines; }
+
+    /// The characters of the text; the one behind the last line's end does not count.
+    qint64 length() const;
+
+    /// Lays out the characters from `start` to `stop` (-1: to the end) as far as they fit a rectangle in twips.
+    /// @param painter  draws them where it is not null; it must paint on the pager's device
+    /// @return the first character that did not fit; `start` where the rectangle is empty
+    qint64 layOut(const QRect &twips, qint64 start, qint64 stop, QPainter *painter = nullptr) const;
+
+private:
+    const QTextDocument &text_;
+    QPaintDevice &device_;
+    int usualLines_ = 0;
+};
+
+} // namespace kareport

@@ -1,0 +1,16 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QRect>
+
+class QPainter;
+
+namespace kareport
+{
+
+/// Draws the edges of a rectangle in twips, and a numbered line for each row of text between them. Nothing where the
+/// painter does not paint.
+KAREPORT_EXPORT void drawMargins(QPainter &painter, const QRect &twips);
+
+} // namespace kareport

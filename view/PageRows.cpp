@@ -1,0 +1,242 @@
+#include "PageRows.h"
+
+#include <QFontMetricsF>
+#include <QGlyphRun>
+#include <QPaintEngine>
+#include <QPainter>
+#include <QRawFont>
+#include <QTextBlock>
+#include <QTextDocument>
+#include <QTextLayout>
+
+#include <algorithm>
+
+namespace kareport
+{
+
+namespace
+{
+
+/// A line without end is laid out so many characters at a time, or each page of it would cost the whole line.
+constexpr int pieceLength = 2000;
+
+/// Characters that stand side by side as they come: no tab, nothing that combines or runs from right to left.
+bool isPlain(char16_t character)
+{
+    constexpr char16_t softHyphen = 0xAD;
+    return (character >= u' ' && character < 0x7F) ||
+           (character >= 0xA0 && character < 0x300 && character != softHyphen) ||
+           (character >= 0x370 && character < 0x483) ||   // Greek, Cyrillic
+           (character >= 0x2500 && character < 0x2600) || // frames and shapes
+           (character >= 0x3041 && character < 0x3097) || (character >= 0x30A1 && character < 0x30FF) ||
+           (character >= 0x3400 && character < 0xA000) || (character >= 0xAC00 && character < 0xD7A4);
+}
+
+} // namespace
+
+PageRows::PageRows(const QTextDocument &text, PrintFaces &faces, QPaintDevice &device, const PageArea &area,
+                   QPainter *painter)
+    : text_(text), faces_(faces), device_(device), area_(area), painter_(painter)
+{
+    if (painter_ != nullptr) {
+        painter_->save();
+        // A picture, which a preview is made of, keeps texts only.
+        drawsGlyphs_ = painter_->paintEngine()->type() != QPaintEngine::Picture;
+    }
+}
+
+PageRows::~PageRows()
+{
+    if (painter_ != nullptr) {
+        painter_->restore();
+    }
+}
+
+int PageRows::addLine(const QTextBlock &block, int from, int stop)
+{
+    line_ = block.text();
+    readRuns(block, from, stop);
+    const qreal width = plainWidth();
+    if (width < 0 || width > area_.width) {
+        return addWrapped(from, stop);
+    }
+    const Extents line = extents(from, stop);
+    if (!reserve(line.height)) {
+        return from;
+    }
+    if (painter_ != nullptr) {
+        drawRuns(area_.top + y_ + line.ascent);
+    }
+    y_ += line.height;
+    return stop;
+}
+
+void PageRows::readRuns(const QTextBlock &block, int from, int stop)
+{
+    runs_.clear();
+    for (auto it = block.begin(); !it.atEnd(); ++it) {
+        const QTextFragment fragment = it.fragment();
+        const int first = std::max(from, fragment.position() - block.position());
+        const int last = std::min(stop, fragment.position() - block.position() + fragment.length());
+        if (first < last) {
+            runs_.push_back({first, last - first, &faces_.face(fragment.charFormat(), fragment.charFormatIndex())});
+        }
+    }
+    if (runs_.empty()) {
+        const PrintFace &face =
+            block.length() > 1 ? faces_.base() : faces_.face(block.charFormat(), block.charFormatIndex());
+        runs_.push_back({from, stop - from, &face});
+    }
+}
+
+qreal PageRows::plainWidth() const
+{
+    qreal width = 0;
+    for (const Run &run : runs_) {
+        const QStringView text = QStringView(line_).mid(run.from, run.length);
+        if (!std::all_of(text.begin(), text.end(), [](QChar character) { return isPlain(character.unicode()); })) {
+            return -1;
+        }
+        width += widthOf(run);
+    }
+    return width;
+}
+
+bool PageRows::reserve(int height)
+{
+    full_ = y_ > 0 && y_ + height > area_.height;
+    return !full_;
+}
+
+PageRows::Extents PageRows::extents(int from, int stop) const
+{
+    int ascent = 0;
+    int descent = 0;
+    for (const Run &run : runs_) {
+        if (run.length == 0 || (run.from < stop && run.from + run.length > from)) {
+            ascent = std::max(ascent, run.face->ascent);
+            descent = std::max(descent, run.face->height - run.face->ascent);
+        }
+    }
+    return {ascent, ascent + descent};
+}
+
+bool PageRows::hasGlyphs(const PrintFace &face, QStringView text)
+{
+    return face.pitch > 0 && std::all_of(text.begin(), text.end(), [&face](QChar character) {
+               return character.unicode() < face.glyphs.size() && face.glyphs.at(character.unicode()) != 0;
+           });
+}
+
+qreal PageRows::widthOf(const Run &run) const
+{
+    const QStringView text = QStringView(line_).mid(run.from, run.length);
+    return hasGlyphs(*run.face, text) ? qreal(run.face->pitch) * run.length
+                                      : QFontMetricsF(run.face->font, &device_).horizontalAdvance(text.toString());
+}
+
+void PageRows::use(const PrintFace &face)
+{
+    if (used_ != &face) {
+        painter_->setFont(face.font);
+        painter_->setPen(face.color);
+        used_ = &face;
+    }
+}
+
+void PageRows::drawRuns(qreal baseline)
+{
+    qreal x = area_.left;
+    for (const Run &run : runs_) {
+        const QStringView text = QStringView(line_).mid(run.from, run.length);
+        use(*run.face);
+        if (drawsGlyphs_ && hasGlyphs(*run.face, text)) {
+            drawGlyphs(run, x, baseline);
+        } else if (!text.isEmpty()) {
+            painter_->drawText(QPointF(x, baseline), text.toString());
+        }
+        x += widthOf(run);
+    }
+}
+
+void PageRows::drawGlyphs(const Run &run, qreal x, qreal baseline)
+{
+    // One blank of several is enough to tell words apart when the text is read back, and blanks cost what letters cost.
+    const bool keepsBlanks = run.face->font.underline();
+    glyphs_.clear();
+    places_.clear();
+    for (int i = 0; i < run.length; ++i) {
+        const char16_t character = line_[run.from + i].unicode();
+        if (character != u' ' || keepsBlanks || (i > 0 && line_[run.from + i - 1] != u' ')) {
+            glyphs_.push_back(run.face->glyphs.at(character));
+            places_.emplace_back(qreal(i) * run.face->pitch, 0);
+        }
+    }
+    if (!glyphs_.empty()) {
+        QGlyphRun glyphs;
+        glyphs.setRawFont(run.face->raw);
+        glyphs.setUnderline(run.face->font.underline());
+        glyphs.setRawData(glyphs_.data(), places_.data(), static_cast<int>(glyphs_.size()));
+        painter_->drawGlyphRun(QPointF(x, baseline), glyphs);
+    }
+}
+
+void PageRows::prepare(QTextLayout &layout, int from, int stop) const
+{
+    QTextOption option(Qt::AlignLeft);
+    option.setWrapMode(QTextOption::WrapAtWordBoundaryOrAnywhere);
+    option.setTabStopDistance(text_.defaultTextOption().tabStopDistance()); // screen pixels, which the layout converts
+    option.setTextDirection(line_.isRightToLeft() ? Qt::RightToLeft : Qt::LeftToRight);
+    layout.setTextOption(option);
+    layout.setCacheEnabled(true);
+    QList<QTextLayout::FormatRange> formats;
+    for (const Run &run : runs_) {
+        const int first = std::max(from, run.from);
+        const int last = std::min(stop, run.from + run.length);
+        if (first < last) {
+            QTextCharFormat format;
+            format.setFont(run.face->font);
+            format.setForeground(run.face->color);
+            formats.push_back({first - from, last - first, format});
+        }
+    }
+    layout.setFormats(formats);
+}
+
+int PageRows::addWrapped(int from, int stop)
+{
+    while (from < stop) {
+        int pieceEnd = std::min(stop, from + pieceLength);
+        if (pieceEnd < stop && line_[pieceEnd].isLowSurrogate()) {
+            --pieceEnd;
+        }
+        QTextLayout layout(line_.mid(from, pieceEnd - from), runs_.front().face->font, &device_);
+        prepare(layout, from, pieceEnd);
+        layout.beginLayout();
+        const int pieceStart = from;
+        for (QTextLine row = layout.createLine(); row.isValid(); row = layout.createLine()) {
+            row.setLineWidth(area_.width);
+            const int rowEnd = pieceStart + row.textStart() + row.textLength();
+            if (rowEnd == pieceEnd && pieceEnd < stop && row.textStart() > 0) {
+                break; // the row goes on in the next piece
+            }
+            const Extents taken = extents(from, rowEnd);
+            if (!reserve(taken.height)) {
+                layout.endLayout();
+                return from;
+            }
+            if (painter_ != nullptr) {
+                used_ = nullptr;
+                painter_->setPen(Qt::black);
+                const qreal baseline = area_.top + y_ + taken.ascent;
+                row.draw(painter_, QPointF(area_.left, baseline - row.ascent()) - row.position());
+            }
+            y_ += taken.height;
+            from = rowEnd;
+        }
+        layout.endLayout();
+    }
+    return stop;
+}
+
+} // namespace kareport

@@ -1,0 +1,28 @@
+#pragma once
+
+#include "PageSetupDialog.h"
+
+#include <QSize>
+#include <QString>
+
+#include <memory>
+
+class QPrinter;
+
+namespace kareport
+{
+
+/// Whether there is a printer to print on: an installed one, or the built-in page device where the host has chosen it.
+bool hasReportPrinter();
+/// That printer, upright or not, ready for whole sheets. The built-in page device prints into a file named after the
+/// report. @return null when it cannot be made
+std::shared_ptr<QPrinter> makeReportPrinter(bool portrait, const QString &title);
+/// The sheet that a printer is set to, in twips.
+QSize sheetInTwips(const QPrinter &printer);
+
+/// The printers to choose from, and the one that is chosen.
+void fillPrinters(PageSetup &setup);
+/// Makes an installed printer the one that the application prints on.
+void selectPrinter(const QString &name);
+
+} // namespace kareport

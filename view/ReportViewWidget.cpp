@@ -1,0 +1,210 @@
+#include "ReportViewWidget.h"
+
+#include "FindBar.h"
+#include "PageBar.h"
+#include "ReportEdit.h"
+#include "Xlate.h"
+
+#include <QHBoxLayout>
+#include <QKeyEvent>
+#include <QLabel>
+#include <QLineEdit>
+#include <QScrollBar>
+#include <QTextBlock>
+#include <QVBoxLayout>
+
+#include <algorithm>
+
+namespace kareport
+{
+
+namespace
+{
+
+constexpr int usualLinesPerPage = 72;
+
+QLabel *newLabel(QWidget *parent, const QString &name, const QString &widest)
+{
+    auto *label = new QLabel(parent);
+    label->setAccessibleName(name);
+    // A label of one width is not laid out anew at every key.
+    label->setMinimumWidth(label->fontMetrics().horizontalAdvance(widest));
+    return label;
+}
+
+/// The column of a place in a line, from 1; a surrogate pair is one character.
+qsizetype columnOf(const QTextCursor &cursor)
+{
+    const QString line = cursor.block().text();
+    const QStringView before = QStringView(line).first(cursor.positionInBlock());
+    return before.size() + 1 -
+           std::count_if(before.begin(), before.end(), [](QChar character) { return character.isLowSurrogate(); });
+}
+
+} // namespace
+
+ReportViewWidget::ReportViewWidget(QWidget *parent)
+    : QWidget(parent),
+      edit_(new ReportEdit(this)),
+      findBar_(new FindBar(*edit_, this)),
+      pageBar_(
+          new PageBar([this](int page) { goToPage(page); }, [this] { edit_->setFocus(Qt::OtherFocusReason); }, this)),
+      pageLabel_(newLabel(this, Xlate("Page"), Xlate("Page %1 of %2").arg(88888).arg(88888))),
+      lineLabel_(newLabel(this, Xlate("Line"), Xlate("Line %1").arg(8888888))),
+      columnLabel_(newLabel(this, Xlate("Column"), Xlate("Column %1").arg(8888))),
+      zoomLabel_(newLabel(this, Xlate("Zoom"), Xlate("%1 %").arg(888)))
+{
+    auto *status = new QHBoxLayout;
+    status->setContentsMargins(6, 2, 6, 2);
+    status->setSpacing(12);
+    status->addWidget(pageLabel_);
+    status->addWidget(lineLabel_);
+    status->addWidget(columnLabel_);
+    status->addStretch();
+    status->addWidget(zoomLabel_);
+
+    auto *column = new QVBoxLayout(this);
+    column->setContentsMargins(0, 0, 0, 0);
+    column->setSpacing(0);
+    column->addWidget(edit_, 1);
+    column->addWidget(findBar_);
+    column->addWidget(pageBar_);
+    column->addLayout(status);
+
+    setFocusProxy(edit_);
+    edit_->setZoomHandler([this] { showZoom(); });
+    connect(edit_, &QPlainTextEdit::cursorPositionChanged, this, [this] { showPlace(); });
+    connect(edit_, &QPlainTextEdit::blockCountChanged, this, [this] { showPlace(); });
+    for (QWidget *child : {edit_->viewport(), static_cast<QWidget *>(&findBar_->field())}) {
+        child->installEventFilter(this);
+    }
+    showPlace();
+    showZoom();
+}
+
+void ReportViewWidget::setLinesPerPage(std::function<int()> linesPerPage)
+{
+    linesPerPage_ = std::move(linesPerPage);
+    showPlace();
+}
+
+int ReportViewWidget::linesPerPage() const
+{
+    return linesPerPage_ ? std::max(1, linesPerPage_()) : usualLinesPerPage;
+}
+
+int ReportViewWidget::pageCount() const
+{
+    // The line that the last line end opens does not begin a page.
+    const QTextDocument *document = edit_->document();
+    const bool isOpen = document->blockCount() > 1 && document->lastBlock().length() <= 1;
+    return (document->blockCount() - (isOpen ? 1 : 0) - 1) / linesPerPage() + 1;
+}
+
+int ReportViewWidget::currentPage() const
+{
+    return std::min(pageCount(), edit_->textCursor().blockNumber() / linesPerPage() + 1);
+}
+
+void ReportViewWidget::goToPage(int page)
+{
+    const int line = (std::clamp(page, 1, pageCount()) - 1) * linesPerPage();
+    const QTextBlock block = edit_->document()->findBlockByNumber(line);
+    edit_->setTextCursor(QTextCursor(block));
+    edit_->verticalScrollBar()->setValue(block.firstLineNumber());
+}
+
+void ReportViewWidget::showPlace()
+{
+    const QTextCursor cursor = edit_->textCursor();
+    pageLabel_->setText(Xlate("Page %1 of %2").arg(currentPage()).arg(pageCount()));
+    lineLabel_->setText(Xlate("Line %1").arg(cursor.blockNumber() + 1));
+    columnLabel_->setText(Xlate("Column %1").arg(columnOf(cursor)));
+}
+
+void ReportViewWidget::showZoom()
+{
+    zoomLabel_->setText(Xlate("%1 %@@zoom in percent").arg(edit_->zoomPercent()));
+}
+
+void ReportViewWidget::openFindBar()
+{
+    pageBar_->hide();
+    findBar_->open();
+}
+
+void ReportViewWidget::openPageBar()
+{
+    findBar_->hide();
+    pageBar_->open(currentPage(), pageCount());
+}
+
+void ReportViewWidget::findNext()
+{
+    if (findBar_->field().text().isEmpty()) {
+        openFindBar();
+    } else {
+        findBar_->findNext();
+    }
+}
+
+void ReportViewWidget::findPrevious()
+{
+    if (findBar_->field().text().isEmpty()) {
+        openFindBar();
+    } else {
+        findBar_->findPrevious();
+    }
+}
+
+void ReportViewWidget::closeBar()
+{
+    findBar_->isVisible() ? findBar_->close() : pageBar_->close();
+}
+
+ReportViewWidget::Action ReportViewWidget::actionOfKey(const QKeyEvent &event) const
+{
+    const auto modifiers = event.modifiers() & ~Qt::KeypadModifier;
+    switch (event.key()) {
+    case Qt::Key_F: return modifiers == Qt::ControlModifier ? &ReportViewWidget::openFindBar : nullptr;
+    case Qt::Key_G: return modifiers == Qt::ControlModifier ? &ReportViewWidget::openPageBar : nullptr;
+    case Qt::Key_F3:
+        return modifiers == Qt::NoModifier      ? &ReportViewWidget::findNext
+               : modifiers == Qt::ShiftModifier ? &ReportViewWidget::findPrevious
+                                                : nullptr;
+    case Qt::Key_Escape:
+        return modifiers == Qt::NoModifier && (findBar_->isVisible() || pageBar_->isVisible())
+                   ? &ReportViewWidget::closeBar
+                   : nullptr;
+    default: return nullptr;
+    }
+}
+
+bool ReportViewWidget::event(QEvent *event)
+{
+    // These keys belong to the window also where a menu has them.
+    if (event->type() == QEvent::ShortcutOverride && actionOfKey(*static_cast<QKeyEvent *>(event)) != nullptr) {
+        event->accept();
+        return true;
+    }
+    return QWidget::event(event);
+}
+
+void ReportViewWidget::keyPressEvent(QKeyEvent *event)
+{
+    if (const Action action = actionOfKey(*event)) {
+        (this->*action)();
+        return;
+    }
+    QWidget::keyPressEvent(event);
+}
+
+bool ReportViewWidget::eventFilter(QObject *watched, QEvent *event)
+{
+    if (event->type() == QEvent::MouseButtonPress && pressed_) {
+        pressed_();
+    }
+    return QWidget::eventFilter(watched, event);
+}
+
+} // namespace kareport

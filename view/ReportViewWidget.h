@@ -1,0 +1,74 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QWidget>
+
+#include <functional>
+
+class QLabel;
+
+namespace kareport
+{
+
+class FindBar;
+class PageBar;
+class ReportEdit;
+
+/// The window of a report view: the text, the bars that find a text and go to a page, and a line that says where the
+/// cursor is.
+class KAREPORT_EXPORT ReportViewWidget : public QWidget
+{
+public:
+    explicit ReportViewWidget(QWidget *parent = nullptr);
+
+    ReportEdit &edit() const { return *edit_; }
+    FindBar &findBar() const { return *findBar_; }
+    PageBar &pageBar() const { return *pageBar_; }
+    QLabel &pageLabel() const { return *pageLabel_; }
+    QLabel &lineLabel() const { return *lineLabel_; }
+    QLabel &columnLabel() const { return *columnLabel_; }
+    QLabel &zoomLabel() const { return *zoomLabel_; }
+
+    /// Where the lines of a page are asked for; 72 without.
+    void setLinesPerPage(std::function<int()> linesPerPage);
+    /// Called when the mouse is pressed in the text or in a bar.
+    void setPressHandler(std::function<void()> handler) { pressed_ = std::move(handler); }
+
+    void openFindBar();
+    void openPageBar();
+    /// Finds on, or opens the find bar when nothing has been looked for yet.
+    void findNext();
+    void findPrevious();
+
+    int pageCount() const;
+    int currentPage() const; ///< from 1
+    /// Puts the cursor at the beginning of a page and shows it at the top. @param page  brought into 1 to `pageCount`
+    void goToPage(int page);
+
+protected:
+    bool event(QEvent *event) override;
+    void keyPressEvent(QKeyEvent *event) override;
+    bool eventFilter(QObject *watched, QEvent *event) override;
+
+private:
+    using Action = void (ReportViewWidget::*)();
+
+    Action actionOfKey(const QKeyEvent &event) const;
+    void closeBar();
+    int linesPerPage() const;
+    void showPlace();
+    void showZoom();
+
+    ReportEdit *edit_;
+    FindBar *findBar_;
+    PageBar *pageBar_;
+    QLabel *pageLabel_;
+    QLabel *lineLabel_;
+    QLabel *columnLabel_;
+    QLabel *zoomLabel_;
+    std::function<int()> linesPerPage_;
+    std::function<void()> pressed_;
+};
+
+} // namespace kareport

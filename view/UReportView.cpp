@@ -1,0 +1,280 @@
+#include "UReportView.h"
+
+#include "ReportChange.h"
+#include "ReportContent.h"
+#include "ReportEdit.h"
+#include "ReportViewWidget.h"
+#include "RichTextWriter.h"
+#include "SingleByteText.h"
+#include "UApplication.h"
+#include "UReportDoc.h"
+#include "UXTPMDIFrameWnd.h"
+
+#include <QApplication>
+#include <QTextBlock>
+#include <QTextDocument>
+
+using kareport::ReportChange;
+using kareport::ReportEdit;
+using kareport::ReportViewWidget;
+
+namespace
+{
+
+/// The longest name of a face.
+constexpr qsizetype longestFaceName = 31;
+
+} // namespace
+
+UReportView::UReportView()
+{
+    auto *widget = new ReportViewWidget;
+    widget_ = widget;
+    edit_ = &widget->edit();
+    widget->setLinesPerPage([this] { return GetDocument() != nullptr ? GetDocument()->GetLinesPerPage() : 0; });
+    widget->setPressHandler([this] { OnMousePress(); });
+    edit_->setFocusHandler([this] { OnSetFocus(); });
+    edit_->setEditHandler([this](const ReportChange &change) { takeEdit(change); });
+    commands_ = makeCommands();
+}
+
+UReportView::~UReportView()
+{
+    OnDestroy();
+    if (UXTPMDIFrameWnd *frame = UXTPMDIFrameWnd::Get()) {
+        frame->GetRibbonBar().RemoveRibbonTabIndexForView(this);
+    }
+    if (widget_) {
+        // It may be in the middle of the very key that closes the view.
+        auto *widget = static_cast<ReportViewWidget *>(widget_.data());
+        edit_->setFocusHandler({});
+        edit_->setEditHandler({});
+        widget->setPressHandler({});
+        widget->setLinesPerPage({});
+        widget->hide();
+        widget->setParent(nullptr);
+        widget->deleteLater();
+    }
+}
+
+UReportDoc *UReportView::GetDocument() const
+{
+    return dynamic_cast<UReportDoc *>(UView::GetDocument());
+}
+
+QWidget *UReportView::GetWidget()
+{
+    return widget_;
+}
+
+ReportEdit &UReportView::GetEdit() const
+{
+    return *edit_;
+}
+
+int UReportView::OnCreate()
+{
+    const UReportDoc *report = GetDocument();
+    if (!widget_ || report == nullptr) {
+        return -1;
+    }
+    edit_->setReportFont(kareport::reportFont(report->GetFontName().left(longestFaceName), report->GetFontSize()));
+    return 0;
+}
+
+void UReportView::OnInitialUpdate()
+{
+    OnCreate();
+    UView::OnInitialUpdate();
+}
+
+void UReportView::OnUpdate(UView *sender, long hint, void *hintObject)
+{
+    if (!widget_) {
+        return; // the window has gone before its view, as it does with a frame that closes
+    }
+    if (hint == ReportChange::hint && hintObject != nullptr && dynamic_cast<UReportView *>(sender) != nullptr) {
+        followEdit(*static_cast<const ReportChange *>(hintObject));
+        return;
+    }
+    m_nWordWrap = WrapNone;
+    WrapChanged();
+    UpdateData(true);
+    UView::OnUpdate(sender, hint, hintObject);
+}
+
+void UReportView::WrapChanged()
+{
+    edit_->setLineWrapMode(m_nWordWrap == WrapToWindow ? ReportEdit::WidgetWidth : ReportEdit::NoWrap);
+}
+
+void UReportView::UpdateData(bool toView)
+{
+    UReportDoc *report = GetDocument();
+    if (report == nullptr || !widget_) {
+        return;
+    }
+    if (!toView) {
+        report->SetData(edit_->windowText());
+        isMirrored_ = report->GetTextLength() == edit_->windowTextLength();
+        report->UpdateAllViews(this, 0, nullptr);
+        return;
+    }
+    QString text;
+    const bool hasImage = report->GetRTFDataFlag();
+    if (hasImage) {
+        report->GetRTFData(text);
+    } else {
+        text = report->CopyText();
+    }
+    const WordWrap wrap = kareport::isRichText(text) ? WrapToWindow : WrapNone;
+    if (m_nWordWrap != wrap) {
+        m_nWordWrap = wrap;
+        WrapChanged();
+    }
+    SetRTFText(text);
+    // A line end of one character in the document makes the lengths differ: only texts whose lines all end with CR LF
+    // are as long there as here.
+    isMirrored_ = !hasImage && wrap == WrapNone && report->GetTextLength() == edit_->windowTextLength();
+}
+
+void UReportView::SetRTFText(const QString &text)
+{
+    isMirrored_ = false;
+    if (kareport::isRichText(text)) {
+        edit_->loadRichText(text);
+    } else {
+        edit_->loadPlainText(text);
+    }
+}
+
+void UReportView::OnChange()
+{
+    if (UReportDoc *report = GetDocument()) {
+        UpdateData(false);
+        report->SetModifiedFlag(true);
+    }
+}
+
+void UReportView::takeEdit(const ReportChange &change)
+{
+    UReportDoc *report = GetDocument();
+    if (report == nullptr) {
+        return;
+    }
+    const bool isReplaced =
+        isMirrored_ && report->GetTextLength() == change.documentLengthBefore() &&
+        report->ReplaceText(change.documentPosition(), change.documentRemoved(), change.documentInserted());
+    if (!isReplaced) {
+        // Rich text, other line ends, or a text that was changed behind the view's back: the document takes over what
+        // the control shows, and every further edit as the change it is.
+        report->SetData(edit_->windowText());
+        isMirrored_ = report->GetTextLength() == edit_->windowTextLength();
+        report->SetModifiedFlag(true);
+    }
+    ReportChange handedOn = change;
+    report->UpdateAllViews(this, ReportChange::hint, &handedOn);
+}
+
+void UReportView::followEdit(const ReportChange &change)
+{
+    if (edit_->applyChange(change)) {
+        return;
+    }
+    // This view shows another text than the one that was edited, such as the image of a report in rich-text mode. The
+    // edited text is the document's.
+    if (const UReportDoc *report = GetDocument()) {
+        m_nWordWrap = WrapNone;
+        WrapChanged();
+        edit_->loadPlainText(report->CopyText());
+        isMirrored_ = report->GetTextLength() == edit_->windowTextLength();
+    }
+}
+
+void UReportView::OnSetFocus()
+{
+    UApplication *application = UApplication::Get();
+    if (application == nullptr) {
+        return;
+    }
+    if (application->GetCurrentReport() == nullptr) {
+        application->SetCompanionView(nullptr);
+        return;
+    }
+    UReportDoc *report = GetDocument();
+    if (report != application->GetCurrentReport()) {
+        application->SetCurrentReport(report);
+        if (UXTPMDIFrameWnd *frame = UXTPMDIFrameWnd::Get()) {
+            frame->SetActiveViewForFrameAndPane(this);
+        }
+    }
+}
+
+void UReportView::OnMousePress()
+{
+    UXTPMDIFrameWnd *frame = UXTPMDIFrameWnd::Get();
+    if (frame == nullptr || !widget_) {
+        return;
+    }
+    const QWidget *focus = QApplication::focusWidget();
+    const bool hasFocus = focus != nullptr && (focus == widget_ || widget_->isAncestorOf(focus));
+    if (frame->GetActiveView() != this) {
+        frame->SetActiveViewForFrameAndPane(this);
+    }
+    if (!hasFocus) {
+        edit_->setFocus(Qt::MouseFocusReason);
+    }
+}
+
+void UReportView::OnDestroy()
+{
+    if (UXTPMDIFrameWnd *frame = UXTPMDIFrameWnd::Get()) {
+        frame->ResetActiveViewForFrameAndPane(this);
+    }
+}
+
+void UReportView::OnReportExit()
+{
+    UReportDoc *report = GetDocument();
+    if (report != nullptr && report->GetReportWindow() != nullptr) {
+        report->SetCloseDocument(1);
+    }
+    if (UXTPMDIFrameWnd *frame = UXTPMDIFrameWnd::Get()) {
+        frame->close();
+    }
+}
+
+void UReportView::OnSaveReportText()
+{
+    if (GetDocument() != nullptr) {
+        GetDocument()->SaveText();
+    }
+}
+
+bool UReportView::streamRichText(QIODevice &device) const
+{
+    return widget_ && kareport::writeRichText(device, *edit_->document());
+}
+
+bool UReportView::streamPlainText(QIODevice &device) const
+{
+    if (!widget_) {
+        return false;
+    }
+    // Line by line, so that a long report is not copied as a whole.
+    constexpr qsizetype pieceSize = 64 * 1024;
+    QString piece;
+    for (QTextBlock block = edit_->document()->begin(); block.isValid(); block = block.next()) {
+        piece += block.text().replace(QChar::LineSeparator, QLatin1Char('\n'));
+        if (block.next().isValid()) {
+            piece += u'\n';
+        }
+        if (piece.size() >= pieceSize) {
+            if (!kareport::writeSingleByteText(device, piece, kareport::WideCharacters::QuestionMark)) {
+                return false;
+            }
+            piece.resize(0);
+        }
+    }
+    return kareport::writeSingleByteText(device, piece, kareport::WideCharacters::QuestionMark);
+}

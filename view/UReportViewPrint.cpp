@@ -1,0 +1,308 @@
+#include "UReportView.h"
+
+#include "AppMessageBox.h"
+#include "LinePager.h"
+#include "MarginPicture.h"
+#include "Preferences.h"
+#include "PrintDialogs.h"
+#include "PrintGeometry.h"
+#include "PrintJob.h"
+#include "ReportEdit.h"
+#include "ReportPrinter.h"
+#include "UPreviewDlg.h"
+#include "UReportDoc.h"
+#include "Xlate.h"
+
+#include <QPaintEngine>
+#include <QPainter>
+#include <QPrinter>
+#include <QTextDocument>
+
+#include <stdexcept>
+
+namespace
+{
+
+using kareport::PrintInfo;
+using kareport::PrintOutcome;
+using kareport::PrintResult;
+
+/// A preview keeps its pages in memory.
+constexpr int mostPreviewPages = 2000;
+
+/// Prints in the report's orientation for the time of one command.
+class ReportOrientation
+{
+public:
+    ReportOrientation() : before_(UPreviewDlg::IsModulePrinterOrientationPortrait())
+    {
+        UPreviewDlg::SetModulePrinterOrientationPortrait(IsReportPrinterSetToPortrait());
+    }
+    ~ReportOrientation() { UPreviewDlg::SetModulePrinterOrientationPortrait(before_); }
+    ReportOrientation(const ReportOrientation &) = delete;
+    ReportOrientation &operator=(const ReportOrientation &) = delete;
+
+private:
+    bool before_;
+};
+
+/// The text of a view as a job begins with it. View, control and text may go while a window is open.
+class PrintedText
+{
+public:
+    explicit PrintedText(UReportView &view)
+        : widget_(view.GetWidget()), text_(view.GetEdit().document()), revision_(text_->revision()), view_(view)
+    {}
+
+    bool isUnchanged() const
+    {
+        return widget_ != nullptr && text_ != nullptr && view_.GetEdit().document() == text_ &&
+               text_->revision() == revision_;
+    }
+    bool isOpen() const { return widget_ != nullptr; }
+
+private:
+    QPointer<QWidget> widget_;
+    QPointer<QTextDocument> text_;
+    int revision_;
+    UReportView &view_;
+};
+
+/// Matches the page model with the printer. @return false, having said so, when the page has no room for text
+bool hasRoom(UReportDoc &report)
+{
+    if (report.SetPageSize() == 0) {
+        return true; // preparing the job says that there is no printer
+    }
+    const QSize sheet = kareport::twipsOfDots(report.GetPageSize(), report.GetPrintResolution());
+    if (kareport::leavesRoom(sheet, kareport::twipsOfHundredths(report.GetMargins()))) {
+        return true;
+    }
+    AppMessageBox(Xlate("The margins leave no room for text on the paper. Choose smaller margins under Page Setup."));
+    return false;
+}
+
+PrintOutcome printText(UReportView &view, QPrinter &printer, PrintInfo &info, int lastPage)
+{
+    const PrintedText text(view);
+    info.printer = &printer;
+    kareport::PrintSource source;
+    source.expectedPages = info.maxPage;
+    source.begin = [&](QPainter &painter) { view.OnBeginPrinting(painter, info); };
+    source.end = [&](QPainter &painter) {
+        if (text.isOpen()) {
+            view.OnEndPrinting(painter, info);
+        }
+    };
+    const auto isKnown = [&view](int page) { return view.GetPageStarts().size() >= static_cast<std::size_t>(page); };
+    source.find = [&, isKnown](QPainter &painter, int page) {
+        info.curPage = page;
+        view.OnPrepareDC(painter, info);
+        // A page that is found is printed, also behind the last that was counted: long lines take several rows.
+        return isKnown(page) && !view.GetEdit().document()->isEmpty();
+    };
+    source.print = [&, isKnown](QPainter &painter, int page) {
+        info.curPage = page;
+        view.OnPrint(painter, info);
+        return isKnown(page + 1);
+    };
+    source.isUnchanged = [&text] { return text.isUnchanged(); };
+    return kareport::printPages(printer, source, view.GetWidget(), lastPage);
+}
+
+void sayOutcome(const PrintOutcome &outcome, const QString &printer)
+{
+    switch (outcome.result) {
+    case PrintResult::Done:
+    case PrintResult::Cancelled: break;
+    case PrintResult::Empty: AppMessageBox(Xlate("There is nothing to print on the chosen pages.")); break;
+    case PrintResult::Changed:
+        AppMessageBox(Xlate("The report has changed while it was printed, and nothing of it was sent to the printer. "
+                            "Print it again."));
+        break;
+    case PrintResult::Failed:
+        AppMessageBox(Xlate("The report could not be printed on \"%1\". Check the printer, or choose another one, and "
+                            "print again. Nothing of the report is lost.")
+                          .arg(printer) +
+                      (outcome.reason.isEmpty() ? QString() : QStringLiteral("\n\n") + outcome.reason));
+        break;
+    }
+}
+
+QString nameOf(const QPrinter &printer)
+{
+    return printer.outputFileName().isEmpty() ? printer.printerName() : printer.outputFileName();
+}
+
+} // namespace
+
+void UReportView::OnReportPrint()
+{
+    if (GetDocument() != nullptr && !hasRoom(*GetDocument())) {
+        return;
+    }
+    const ReportOrientation orientation;
+    PrintInfo info;
+    if (OnPreparePrinting(info)) {
+        const QString name = nameOf(*info.printer);
+        sayOutcome(printText(*this, *info.printer, info, 0), name);
+    }
+}
+
+void UReportView::OnReportPrintPreview()
+{
+    if (GetDocument() != nullptr && !hasRoom(*GetDocument())) {
+        return;
+    }
+    const ReportOrientation orientation;
+    PrintInfo info;
+    info.preview = true;
+    if (!OnPreparePrinting(info)) {
+        return;
+    }
+    if (info.maxPage > mostPreviewPages) {
+        AppMessageBox(Xlate("The preview shows the first %1 pages. All pages are printed.").arg(mostPreviewPages));
+    }
+    const PrintedText text(*this);
+    const QSize preparedSheet = kareport::sheetInTwips(*info.printer);
+    const QSize preparedPaper = m_sizePaper;
+    kareport::showPreview(*info.printer, GetWidget(), [&](QPrinter &printer) {
+        if (!text.isOpen()) {
+            return;
+        }
+        const QSize sheet = kareport::sheetInTwips(printer);
+        m_sizePaper = sheet == preparedSheet ? preparedPaper : sheet; // turned or changed in the preview
+        const bool prints = printer.paintEngine()->type() != QPaintEngine::Picture;
+        PrintInfo shown = info;
+        const PrintOutcome outcome = printText(*this, printer, shown, prints ? 0 : mostPreviewPages);
+        if (prints) {
+            sayOutcome(outcome, nameOf(printer));
+        }
+    });
+}
+
+bool UReportView::OnPreparePrinting(PrintInfo &info)
+{
+    const UReportDoc *report = GetDocument();
+    if (report == nullptr) {
+        return false;
+    }
+    m_sizePaper = kareport::twipsOfDots(report->GetPageSize(), report->GetPrintResolution());
+    info.maxPage = kareport::pageCount(report->GetLineCount(), report->GetLinesPerPage());
+    m_rectMargin = kareport::twipsOfHundredths(report->GetMargins());
+    if (info.printer == nullptr) {
+        if (!kareport::hasReportPrinter()) {
+            AppMessageBox(QStringLiteral("No Default Printer is Installed!!!"));
+            return false;
+        }
+        info.ownPrinter =
+            kareport::makeReportPrinter(UPreviewDlg::IsModulePrinterOrientationPortrait(), report->GetTitle());
+        info.printer = info.ownPrinter.get();
+        if (info.printer == nullptr) {
+            return false;
+        }
+    }
+    if (info.preview) {
+        return true;
+    }
+    const PrintedText text(*this);
+    const QSize sheet = kareport::sheetInTwips(*info.printer);
+    if (!kareport::askPrint(*info.printer, info.maxPage, GetWidget()) || !text.isOpen()) {
+        return false;
+    }
+    info.printer->setFullPage(true);
+    if (kareport::sheetInTwips(*info.printer) != sheet) {
+        m_sizePaper = kareport::sheetInTwips(*info.printer); // another one was chosen for this job
+    }
+    return true;
+}
+
+void UReportView::OnBeginPrinting(QPainter & /*painter*/, PrintInfo & /*info*/)
+{
+    m_aPageStart.assign(1, 0);
+}
+
+void UReportView::OnEndPrinting(QPainter & /*painter*/, PrintInfo & /*info*/)
+{
+    m_aPageStart.clear();
+}
+
+void UReportView::OnPrepareDC(QPainter &painter, PrintInfo &info)
+{
+    // A page may be asked for before the pages in front of it have been printed.
+    while (!m_aPageStart.empty() && static_cast<qint64>(m_aPageStart.size()) < info.curPage) {
+        const kareport::LinePager pager = makePager(*painter.device());
+        const qint64 next = pager.layOut(printableRect(), m_aPageStart.back(), -1);
+        if (next >= pager.length() || next <= m_aPageStart.back()) {
+            info.maxPage = static_cast<int>(m_aPageStart.size());
+            return;
+        }
+        m_aPageStart.push_back(next);
+    }
+}
+
+void UReportView::OnPrint(QPainter &painter, PrintInfo &info)
+{
+    const auto pages = static_cast<qint64>(m_aPageStart.size());
+    if (info.curPage < 1 || info.curPage > pages) {
+        throw std::invalid_argument("the start of the page is not known");
+    }
+    const qint64 start = m_aPageStart[static_cast<std::size_t>(info.curPage) - 1];
+    const qint64 next = PrintPage(painter, start, -1);
+    if (next >= GetEdit().document()->characterCount() - 1) {
+        info.maxPage = info.curPage;
+    } else if (info.curPage == pages) {
+        m_aPageStart.push_back(next);
+    }
+}
+
+qint64 UReportView::PrintPage(QPainter &painter, qint64 start, qint64 stop)
+{
+    return painter.device() == nullptr ? start
+                                       : makePager(*painter.device()).layOut(printableRect(), start, stop, &painter);
+}
+
+void UReportView::DrawMargins(QPainter &painter)
+{
+    kareport::drawMargins(painter, printableRect());
+}
+
+QRect UReportView::printableRect() const
+{
+    return kareport::printableRect(m_sizePaper, m_rectMargin);
+}
+
+kareport::LinePager UReportView::makePager(QPaintDevice &device) const
+{
+    kareport::LinePager pager(*GetEdit().document(), device);
+    pager.setUsualLines(GetDocument() == nullptr ? 0 : GetDocument()->GetLinesPerPage());
+    return pager;
+}
+
+void UReportView::OnPageSetup()
+{
+    UReportDoc *report = GetDocument();
+    if (report == nullptr) {
+        return;
+    }
+    const ReportOrientation orientation;
+    if (!kareport::hasReportPrinter()) {
+        AppMessageBox(Xlate("Failed to get default printer settings."));
+        return;
+    }
+    kareport::PageSetup setup;
+    setup.margins = report->GetMargins();
+    setup.portrait = UPreviewDlg::IsModulePrinterOrientationPortrait();
+    kareport::fillPrinters(setup);
+    const PrintedText text(*this);
+    if (!kareport::askPageSetup(setup, GetWidget()) || !text.isOpen()) {
+        return;
+    }
+    UPreviewDlg::SetModulePrinterOrientationPortrait(setup.portrait);
+    kareport::selectPrinter(setup.printer);
+    report->SetMargins(setup.margins);
+    report->SetPageSize();
+    report->SaveSettings();
+    // After the measurement, which the next print command repeats: the report that is open keeps its pages till then.
+    SetReportPrinterToPortrait(UPreviewDlg::IsModulePrinterOrientationPortrait());
+}
