@@ -26,7 +26,7 @@ std::optional<RichTextError> showReportContent(const UReportDoc &report, QTextDo
     if (report.GetRTFDataFlag()) {
         report.GetRTFData(text);
     } else {
-        text = report.GetText().toString();
+        text = report.CopyText();
     }
     if (isRichText(text)) {
         if (report.IsOpenedFromRtf()) {

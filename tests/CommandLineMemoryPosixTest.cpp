@@ -34,13 +34,13 @@ TEST(CommandLineMemory, AReportThatDoesNotFitIsNotWrittenInPart)
     GTEST_SKIP() << "the address sanitizer needs more address space than any limit leaves";
 #endif
     const CommandLineFolder folder;
-    folder.put("big.txt", QByteArray("0123456789\r\n").repeated(2'000'000));
+    folder.put("big.txt", QByteArray("0123456789\r\n").repeated(4'000'000));
     folder.put("out.rep", "kept");
     bool wasRefused = false;
     for (const rlim_t megabytes : {rlim_t(50), rlim_t(100), rlim_t(150), rlim_t(250), rlim_t(350)}) {
         const ProgramRun run = runWithin(folder.path(), words("convert big.txt out.rep"), ownMegabytes + megabytes);
         if (run.status == 0) {
-            EXPECT_EQ(folder.bytesOf("out.rep").size(), 3 + 2'000'000 * 13) << megabytes << ": all of it or nothing";
+            EXPECT_EQ(folder.bytesOf("out.rep").size(), 3 + 4'000'000 * 13) << megabytes << ": all of it or nothing";
             break;
         }
         wasRefused = true;
