@@ -183,7 +183,15 @@ UDocument *DeskFrame::activeDocument() const
 void DeskFrame::newReport()
 {
     if (UReportDoc *report = CreateReport(Xlate("Report"), true, false, nullptr, 0, nullptr)) {
-        UApplication::Get()->SetCurrentReport(report);
+        activate(report);
+    }
+}
+
+void DeskFrame::activate(UDocument *report)
+{
+    UApplication::Get()->SetCurrentReport(report);
+    if (!report->GetViews().empty()) {
+        SetActiveViewForFrameAndPane(report->GetViews().front());
     }
 }
 
@@ -214,7 +222,7 @@ bool DeskFrame::OpenFile(const QString &path)
         kareport::showMessage({error, QString(), MessageButtons::Ok, kareport::MessageIcon::None});
     }
     if (report != nullptr) {
-        UApplication::Get()->SetCurrentReport(report);
+        activate(report);
         statusBar()->clearMessage();
     }
     return report != nullptr;

@@ -34,6 +34,7 @@ private:
     void makeMenus();
     void fillRecentFiles();
     void newReport();
+    void activate(UDocument *report);
     void open();
     void newWindow();
     void arrange(Qt::Orientation orientation);
