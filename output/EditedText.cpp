@@ -14,6 +14,9 @@ constexpr int wrapColumn = 80;
 
 QString textOfBytes(QByteArrayView bytes)
 {
+    if (bytes.size() < 2) {
+        return QString();
+    }
     QString text(bytes.size() / 2, Qt::Uninitialized);
     qFromLittleEndian<char16_t>(bytes.data(), text.size(), text.data());
     return text;
