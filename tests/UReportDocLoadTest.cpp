@@ -123,7 +123,7 @@ TEST(UReportDocLoad, TheFirstLineBeginsWithItsWord)
         EXPECT_TRUE(textOf(written).startsWith(QStringLiteral("before\r\n"))) << row.reason;
         EXPECT_EQ(textOf(written).contains(QStringLiteral("TALVEN")), row.expected.contains(QStringLiteral("TALVEN")))
             << row.reason;
-        const QByteArray front = row.content.first(std::min<qsizetype>(row.content.indexOf('\n'), 3));
+        const QByteArray front = row.content.left(std::min<qsizetype>(row.content.indexOf('\n'), 3));
         EXPECT_TRUE(textOf(written).sliced(8).startsWith(QString::fromLatin1(front)))
             << row.reason << ": behind other text nothing is dropped";
     }
