@@ -1,5 +1,7 @@
 #pragma once
 
+#include "LineEndings.h"
+
 #include <QString>
 
 namespace kareport
@@ -22,7 +24,7 @@ struct ReportChange
     qint64 documentPosition() const { return qint64(position) + lineEndsBefore; }
     qint64 documentRemoved() const { return qint64(removed) + lineEndsRemoved; }
     qint64 documentLengthBefore() const { return qint64(lengthBefore) + lineEndsInAll; }
-    QString documentInserted() const { return QString(inserted).replace(QLatin1Char('\n'), QLatin1String("\r\n")); }
+    QString documentInserted() const { return withCrLf(inserted); }
 };
 
 } // namespace kareport

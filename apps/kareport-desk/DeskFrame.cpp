@@ -87,16 +87,6 @@ std::vector<kareport::Command> DeskFrame::makeCommands()
     return {
         {fileNew, [this] { newReport(); }, {}},
         {fileOpen, [this] { open(); }, {}},
-        {fileClose,
-         [this] {
-             if (auto *pane =
-                     dynamic_cast<COneViewPane *>(GetActiveView() ? GetActiveView()->GetParentPane() : nullptr)) {
-                 pane->OnSysCommand(COneViewPane::scClose, 0);
-             }
-         },
-         hasReport},
-        {fileSave, [this] { activeDocument()->DoFileSave(); }, hasReport},
-        {fileSaveAs, [this] { activeDocument()->DoSave(QString(), true); }, hasReport},
         {appExit, [this] { close(); }, {}},
         {windowNew, [this] { newWindow(); }, hasReport},
         {windowCascade, [this] { cascade(); }, hasReport},
