@@ -19,22 +19,33 @@ QFont reportFont(const QString &name, unsigned points)
     return font;
 }
 
+QString shownText(const UReportDoc &report)
+{
+    if (!report.GetRTFDataFlag()) {
+        return report.CopyText();
+    }
+    QString text;
+    report.GetRTFData(text);
+    return text;
+}
+
+std::optional<RichTextError> readShownRichText(const UReportDoc &report, const QString &text, QTextDocument &document,
+                                               RichTextNotes *notes)
+{
+    if (report.IsOpenedFromRtf() && !report.GetRTFDataFlag()) {
+        // The bytes of the file, one to a character, each line with the line end that loading gave it.
+        QByteArray bytes = text.toLatin1();
+        return readRichText(bytes.replace("\n\r\n", "\n"), document, notes);
+    }
+    return readRichText(text, document, notes);
+}
+
 std::optional<RichTextError> showReportContent(const UReportDoc &report, QTextDocument &document, RichTextNotes *notes)
 {
     document.setDefaultFont(reportFont(report.GetFontName(), report.GetFontSize()));
-    QString text;
-    if (report.GetRTFDataFlag()) {
-        report.GetRTFData(text);
-    } else {
-        text = report.CopyText();
-    }
+    const QString text = shownText(report);
     if (isRichText(text)) {
-        if (report.IsOpenedFromRtf()) {
-            // The bytes of the file, one to a character, each line with the line end that loading gave it.
-            QByteArray bytes = text.toLatin1();
-            return readRichText(bytes.replace("\n\r\n", "\n"), document, notes);
-        }
-        return readRichText(text, document, notes);
+        return readShownRichText(report, text, document, notes);
     }
     document.setPlainText(text);
     return std::nullopt;

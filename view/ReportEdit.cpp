@@ -88,9 +88,15 @@ void ReportEdit::loadPlainText(const QString &text)
 
 std::optional<RichTextError> ReportEdit::loadRichText(QStringView text)
 {
+    return loadRichText([text](QTextDocument &loaded) { return readRichText(text, loaded); });
+}
+
+std::optional<RichTextError>
+ReportEdit::loadRichText(const std::function<std::optional<RichTextError>(QTextDocument &loaded)> &read)
+{
     setPalette(paper());
     QTextDocument *loaded = newDocument(this, font());
-    const auto error = readRichText(text, *loaded);
+    const auto error = read(*loaded);
     take(loaded);
     return error;
 }

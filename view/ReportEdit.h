@@ -33,6 +33,9 @@ public:
     void loadPlainText(const QString &text);
     /// @return what is wrong with the rich text; what was read up to there is shown
     std::optional<RichTextError> loadRichText(QStringView text);
+    /// The same with a reader, which fills the document that it is given.
+    std::optional<RichTextError>
+    loadRichText(const std::function<std::optional<RichTextError>(QTextDocument &loaded)> &read);
 
     /// Called after every edit by the user.
     void setEditHandler(std::function<void(const ReportChange &change)> handler) { edited_ = std::move(handler); }

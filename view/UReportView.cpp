@@ -120,13 +120,7 @@ void UReportView::UpdateData(bool toView)
         report->UpdateAllViews(this, 0, nullptr);
         return;
     }
-    QString text;
-    const bool hasImage = report->GetRTFDataFlag();
-    if (hasImage) {
-        report->GetRTFData(text);
-    } else {
-        text = report->CopyText();
-    }
+    const QString text = kareport::shownText(*report);
     const WordWrap wrap = kareport::isRichText(text) ? WrapToWindow : WrapNone;
     if (m_nWordWrap != wrap) {
         m_nWordWrap = wrap;
@@ -135,14 +129,18 @@ void UReportView::UpdateData(bool toView)
     SetRTFText(text);
     // A line end of one character in the document makes the lengths differ: only texts whose lines all end with CR LF
     // are as long there as here.
-    isMirrored_ = !hasImage && wrap == WrapNone && report->GetTextLength() == edit_->windowTextLength();
+    isMirrored_ = !report->GetRTFDataFlag() && wrap == WrapNone && report->GetTextLength() == edit_->windowTextLength();
 }
 
 void UReportView::SetRTFText(const QString &text)
 {
     isMirrored_ = false;
     if (kareport::isRichText(text)) {
-        edit_->loadRichText(text);
+        const UReportDoc *report = GetDocument();
+        edit_->loadRichText([report, &text](QTextDocument &loaded) {
+            return report != nullptr ? kareport::readShownRichText(*report, text, loaded)
+                                     : kareport::readRichText(text, loaded);
+        });
     } else {
         edit_->loadPlainText(text);
     }
