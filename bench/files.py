@@ -70,7 +70,7 @@ def main():
     parser.add_argument("--build", default=os.path.join(os.path.dirname(__file__), "../build/bench"))
     options = parser.parse_args()
     work = os.path.abspath(f"{options.build}/bench/ka_file_work")
-    program = os.path.abspath(f"{options.build}/apps/kareport/kareport")
+    program = os.path.abspath(f"{options.build}/bin/kareport")
     where = "/dev/shm" if os.access("/dev/shm", os.W_OK) else None
     with tempfile.TemporaryDirectory(dir=where) as folder:
         # In a process of its own: a child that is started shows at least the memory of what started it.

@@ -67,7 +67,7 @@ def main():
     parser.add_argument("--rows", type=int, default=1_000_000)
     parser.add_argument("--runs", type=int, default=7)
     parser.add_argument("--program", default=os.path.join(os.path.dirname(__file__),
-                                                          "../build/bench/apps/kareport/kareport"))
+                                                          "../build/bench/bin/kareport"))
     options = parser.parse_args()
     program = os.path.abspath(options.program)
     where = "/dev/shm" if os.access("/dev/shm", os.W_OK) else None

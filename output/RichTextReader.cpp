@@ -53,15 +53,15 @@ std::optional<RichTextError> readBytes(QByteArrayView bytes, RichTextRawBytes ra
 QStringList RichTextNotes::texts() const
 {
     QStringList sentences;
-    const auto add = [&sentences](int count, const char *sentence) {
+    const auto add = [&sentences](int count, const QString &sentence) {
         if (count > 0) {
-            sentences.append(Xlate(sentence).arg(count));
+            sentences.append(sentence.arg(count));
         }
     };
-    add(pictures, "Pictures are not shown: %1.");
-    add(objects, "Embedded objects and drawings are not shown: %1.");
-    add(footnotes, "Footnotes and comments are not shown: %1.");
-    add(headers, "Page headers and footers are not shown: %1.");
+    add(pictures, Xlate("Pictures are not shown: %1."));
+    add(objects, Xlate("Embedded objects and drawings are not shown: %1."));
+    add(footnotes, Xlate("Footnotes and comments are not shown: %1."));
+    add(headers, Xlate("Page headers and footers are not shown: %1."));
     return sentences;
 }
 

@@ -13,6 +13,9 @@ QFont reportFont(const QString &name, unsigned points)
     QFont font(QStringList{name, QStringLiteral("DejaVu Sans Mono"), QStringLiteral("Liberation Mono")});
     font.setStyleHint(QFont::TypeWriter);
     font.setFixedPitch(true);
+    // Whatever the application's own font is.
+    font.setWeight(QFont::Normal);
+    font.setItalic(false);
     if (points > 0) {
         font.setPointSize(static_cast<int>(points));
     }

@@ -1,13 +1,9 @@
 #include "ReportEntry.h"
 
-#include "Preferences.h"
-#include "Profile.h"
 #include "ReportViewPort.h"
 #include "ReportWindow.h"
 #include "UApplication.h"
 #include "UReportDoc.h"
-
-#include <QFileInfo>
 
 namespace
 {
@@ -22,8 +18,8 @@ kareport::ReportViewPort::~ReportViewPort() = default;
 
 void LoadKaReport() {}
 
-std::unique_ptr<UDocTemplate> ReportInitialTemplate(UDocTemplate::PaneFactory makePane,
-                                                    UDocTemplate::ViewFactory makeView)
+std::unique_ptr<UDocTemplate> kareport::makeReportTemplate(UDocTemplate::PaneFactory makePane,
+                                                           UDocTemplate::ViewFactory makeView)
 {
     return std::make_unique<UDocTemplate>(
         reportResourceId, [] { return std::make_unique<UReportDoc>(); }, std::move(makePane), std::move(makeView),
@@ -63,13 +59,4 @@ UReportDoc *CreateReport(const QString &name, bool headerFlag, bool externalEdit
     report->SetHeaderFlag(headerFlag);
     report->SetExternalEditorFlag(externalEditor);
     return report;
-}
-
-bool IsUseExternalEditor(bool want)
-{
-    if (!want || GetUsePreferredReportEditorFlag() == 0) {
-        return false;
-    }
-    const QString editor = GetProfileString(QString(), GetPreferredReportEditorRegKey());
-    return !editor.isEmpty() && QFileInfo::exists(editor);
 }

@@ -14,10 +14,15 @@ class UReportDoc;
 /// Makes sure that the module is loaded; does nothing else.
 KAREPORT_EXPORT void LoadKaReport();
 
-/// A new document template for reports, which the host adds to its application. With no pane and view given, reports are
-/// made without windows.
-KAREPORT_EXPORT std::unique_ptr<UDocTemplate> ReportInitialTemplate(UDocTemplate::PaneFactory makePane = {},
-                                                                    UDocTemplate::ViewFactory makeView = {});
+namespace kareport
+{
+
+/// A new document template for reports with panes and views of the host's own; with none given, reports are made without
+/// windows. `ReportInitialTemplate` makes the usual one.
+KAREPORT_EXPORT std::unique_ptr<UDocTemplate> makeReportTemplate(UDocTemplate::PaneFactory makePane = {},
+                                                                 UDocTemplate::ViewFactory makeView = {});
+
+} // namespace kareport
 
 /// The application's document template for reports; null when there is no application or no such template.
 KAREPORT_EXPORT UDocTemplate *GetReportTemplate();

@@ -56,6 +56,7 @@ bool UReportDoc::IsReportAvailable(const UReportDoc *report)
 
 void UReportDoc::SetData(const QString &text)
 {
+    ++editCount_;
     if (!page_.text().assign(text)) {
         page_.noteLostText();
     }
@@ -63,6 +64,7 @@ void UReportDoc::SetData(const QString &text)
 
 void UReportDoc::Clear()
 {
+    ++editCount_;
     page_.clear();
     image_.clear();
     openedFromRtf_ = false;

@@ -75,6 +75,9 @@ public:
     bool ReplaceText(qint64 at, qint64 removed, QStringView inserted);
     /// The text's length in characters, and the text as a copy: neither changes how the text is kept.
     qint64 GetTextLength() const { return page_.text().size(); }
+    /// How often a text took the place of another, in whole or in part. What is only written at the end does not count: it
+    /// changes the length.
+    quint64 GetEditCount() const { return editCount_; }
     QString CopyText() const;
     /// Empties the report. The next line written begins page 1.
     virtual void Clear();
@@ -237,6 +240,26 @@ public:
     void SetExternalExcel() { exportOptions_ |= externalExcel; }
     bool IsExternalExcel() const { return (exportOptions_ & externalExcel) != 0; }
 
+    // --- External editor --------------------------------------------------------------------------------------------
+
+    /// Whether the report goes to the user's preferred editor: it is marked for it, and an editor is preferred and
+    /// installed. The preferences are looked up each time.
+    bool UsePreferredReportEditor() const;
+    /// Whether a file is to be converted to rich text for an editor: for a word processor, unless it is rich text or a PDF
+    /// already. With the Excel option and Excel for an editor, the report is an external Excel's from then on.
+    bool IsConvertToOpenInWord(const QString &file, const QString &editor);
+    /// Shows the report as it is now. A report that goes to the user's preferred editor is written into a new temporary
+    /// file and opened there, each time; its pane is hidden. Any other updates its views and shows its pane. Property panes
+    /// are told in either case. With the close-document flag the pane stays as it is, and a report that went to the editor
+    /// closes.
+    void UpdateAllViews(UView *sender, long hint = 0, void *hintObject = nullptr) override;
+    /// Makes a second, hidden report in rich-text mode of the lines of this one, without blank lines, and opens it in the
+    /// user's preferred editor. It stays open. Nothing happens without the application's template for reports.
+    void ConvertAndOpenInWord();
+    /// Opens the report in the user's preferred editor: what was written in rich-text mode for a word processor, the text
+    /// for any other. A report that does not go there is shown in its view, in a new pane where it has none.
+    void ReportRTfData();
+
     // --- Files ------------------------------------------------------------------------------------------------------
 
     /// Saves under a path; asks for one when it is empty or is to become the document's own.
@@ -290,8 +313,25 @@ private:
 
     kareport::FormatOptions formatOptions() const;
     kareport::RichTextImage::Form imageForm() const;
+    bool saveByName(const QString &path);
     bool saveText(const QString &path);
     std::optional<bool> saveViewAsRichText(const QString &path);
+    /// Opens a file that was saved in the user's preferred editor, if the report is marked for it.
+    void openSavedFile(const QString &path) const;
+    void openInEditor(const QString &editor);
+    /// Saves under a temporary name, or under the next one that is free, in a file that only the user can read.
+    /// @return the name; empty when no name is free
+    QString saveForEditor(QString name);
+    /// Writes the rich-text image beside a temporary name. @return the file; empty when it cannot be written
+    QString writeRichTextForEditor(const QString &name) const;
+    /// Writes the lines of another report's text.
+    void writeLinesOf(const kareport::ReportText &text);
+    void showInModule();
+    void showFrame();
+    void openOwnPane();
+
+    /// The window style of a pane that a report opens for itself.
+    static constexpr unsigned ownPaneStyle = 4096;
 
     /// Every live report, with the value true.
     static QHash<const UReportDoc *, bool> UReportMgr;
@@ -321,6 +361,7 @@ private:
     kareport::ReportWindow *reportWindow_ = nullptr;
     int closeMode_ = 0;
     bool closeDocument_;
+    quint64 editCount_ = 0;
     bool openedFromRtf_ = false;
     bool isSerializing_ = false;
     kareport::RichTextImage image_;

@@ -6,6 +6,7 @@ bool UReportDoc::ReplaceText(qint64 at, qint64 removed, QStringView inserted)
         return false;
     }
     if (removed > 0 || !inserted.isEmpty()) {
+        ++editCount_;
         SetModifiedFlag(true);
     }
     return true;

@@ -96,6 +96,15 @@ bool UReportDoc::DoSave(const QString &path, bool replace)
 
 bool UReportDoc::OnSaveDocument(const QString &path)
 {
+    const bool isSaved = saveByName(path);
+    if (isSaved) {
+        OnDocumentEvent(DocumentEvent::AfterSaveDocument);
+    }
+    return isSaved;
+}
+
+bool UReportDoc::saveByName(const QString &path)
+{
     if (isRichTextName(path)) {
         // Without a view that can write it, the report text is saved under the name.
         const auto saved = saveViewAsRichText(path);
@@ -127,6 +136,9 @@ std::optional<bool> UReportDoc::saveViewAsRichText(const QString &path)
             isOpen = true;
             return port->streamRichText(device);
         });
+        if (saved) {
+            openSavedFile(path);
+        }
         if (isOpen) {
             return saved;
         }

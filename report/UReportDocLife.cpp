@@ -14,29 +14,21 @@
 namespace
 {
 
-/// The window style of a pane that a report opens for itself.
-constexpr unsigned ownPaneStyle = 4096;
-
 bool showsReport(const UView *view)
 {
     return dynamic_cast<const kareport::ReportViewPort *>(view) != nullptr;
 }
 
-/// A caption without the number that a pane has among several of one document.
-QStringView withoutNumber(QStringView caption)
+/// Whether an open pane has the title, with the number that it has among several of one document or without.
+bool isTaken(const QString &title)
 {
-    qsizetype end = caption.size();
-    while (end > 0 && caption[end - 1].isDigit()) {
-        --end;
-    }
-    return end > 0 && end < caption.size() && caption[end - 1] == u':' ? caption.first(end - 1) : caption;
-}
-
-bool isTaken(const QString &title, const QStringList &captions)
-{
-    return std::any_of(captions.begin(), captions.end(), [&title](const QString &caption) {
-        return kareport::equalFolded(title, caption) || kareport::equalFolded(title, withoutNumber(caption));
-    });
+    QStringList captions;
+    QStringList titles;
+    CViewPane::GetPaneCaptions(captions);
+    CViewPane::GetPaneTitles(titles);
+    captions += titles;
+    return std::any_of(captions.begin(), captions.end(),
+                       [&title](const QString &caption) { return kareport::equalFolded(title, caption); });
 }
 
 } // namespace
@@ -46,9 +38,7 @@ void UReportDoc::SetTitle(const QString &title)
     const QString given = title; // may be the very title that is numbered below
     title_ = given;
     SetHeader();
-    QStringList captions;
-    CViewPane::GetPaneCaptions(captions);
-    for (int number = 2; isTaken(title_, captions); ++number) {
+    for (int number = 2; isTaken(title_); ++number) {
         title_ = given + u' ' + QString::number(number);
     }
     UDocument::SetTitle(title_);
@@ -74,13 +64,18 @@ CViewPane *UReportDoc::GetFrameWindow() const
     return nullptr;
 }
 
-void UReportDoc::Activate(bool /*reserved*/)
+void UReportDoc::openOwnPane()
 {
     if (UDocTemplate *reportTemplate = GetReportTemplate()) {
         if (CViewPane *pane = reportTemplate->CreateNewPane(this, nullptr, ownPaneStyle, nullptr)) {
             reportTemplate->InitialUpdatePane(pane, this, 1);
         }
     }
+}
+
+void UReportDoc::Activate(bool /*reserved*/)
+{
+    openOwnPane();
     UpdateAllViews(nullptr, 0, nullptr);
 }
 

@@ -111,6 +111,7 @@ int UReportDoc::LoadFile(const QString &path, bool keepLineEnds)
         page_.lineFeed(1);
         page_.countLine();
     }
-    UpdateAllViews(nullptr, 0, nullptr);
-    return HasLostText() ? 0 : 1;
+    const bool hasLostText = HasLostText();
+    UpdateAllViews(nullptr, 0, nullptr); // may hand the report to an editor and close it
+    return hasLostText ? 0 : 1;
 }

@@ -10,6 +10,7 @@ packages_build=(
     g++ cmake ninja-build   # compiler and build
     ccache                  # a second build in seconds
     qt6-base-dev            # text, files, JSON, settings, fonts, printing
+    qt6-l10n-tools          # translations
     libcli11-dev            # the command line
     libhpdf-dev             # PDF
     libfontconfig-dev       # where the faces of a PDF are
@@ -29,6 +30,7 @@ packages_test=(
     cups-filters cups-filters-core-drivers cups-core-drivers # what a queue makes of a job
     fonts-liberation2       # a second fixed-pitch face
     fonts-wqy-zenhei        # a face with CJK
+    qt6-translations-l10n   # Qt's own texts in other languages
 )
 packages_office=(
     libreoffice-writer-nogui # rich text read by somebody else; the tests use it where it is installed

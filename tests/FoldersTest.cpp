@@ -85,6 +85,22 @@ TEST(Folders, TemporaryFilesCanBeMadeInTheSystemsFolder)
     EXPECT_EQ(QDir(GetTempDir(false)), QDir::temp());
 }
 
+TEST(Folders, AFileExistsUnderItsOwnName)
+{
+    const QTemporaryDir folder;
+    const QString path = folder.filePath(QStringLiteral("測量 é"));
+    EXPECT_EQ(IsFileExisting(path), 0);
+    ASSERT_TRUE(QFile(path).open(QIODevice::WriteOnly));
+    EXPECT_NE(IsFileExisting(path), 0);
+    ASSERT_TRUE(QFile::link(path, folder.filePath(QStringLiteral("link"))));
+    ASSERT_TRUE(QFile::link(folder.filePath(QStringLiteral("gone")), folder.filePath(QStringLiteral("loose link"))));
+    EXPECT_NE(IsFileExisting(folder.filePath(QStringLiteral("link"))), 0) << "a link to a file";
+    EXPECT_EQ(IsFileExisting(folder.filePath(QStringLiteral("loose link"))), 0) << "a link to nothing";
+    EXPECT_EQ(IsFileExisting(path + u' '), 0) << "a blank belongs to the name";
+    EXPECT_EQ(IsFileExisting(folder.path()), 0) << "a folder";
+    EXPECT_EQ(IsFileExisting(QString()), 0) << "no name";
+}
+
 class LastOpenFolder : public testing::Test
 {
 protected:

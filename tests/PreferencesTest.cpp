@@ -43,7 +43,7 @@ TEST(Preferences, AreKept)
     SetReportFontSize(0);
     EXPECT_EQ(GetReportFontSize(), 8U) << "no size is the usual one";
     for (const bool on : {false, true}) {
-        SetReportPrinterToPortrait(on);
+        SetReportPrinterSetToPortrait(on);
         EXPECT_EQ(IsReportPrinterSetToPortrait(), on);
         SetUsePreferredReportEditorFlag(!on);
         EXPECT_EQ(GetUsePreferredReportEditorFlag() != 0, !on);
@@ -62,7 +62,7 @@ TEST(Preferences, LiveInTheProfile)
     const QString path = folder.filePath(QStringLiteral("settings.ini"));
     kareport::setProfileStore(kareport::makeSettingsProfile(path));
     SetReportFontSize(11);
-    SetReportPrinterToPortrait(false);
+    SetReportPrinterSetToPortrait(false);
     SetUsePreferredReportEditorFlag(true);
     kareport::setProfileStore(kareport::makeMemoryProfile());
     EXPECT_EQ(GetReportFontSize(), 8U) << "another profile";

@@ -1,3 +1,4 @@
+#include "FrameFixture.h"
 #include "ReportFixture.h"
 
 #include "ReportContent.h"
@@ -64,6 +65,30 @@ TEST(ReportContent, WhatBeginsAsRichTextIsShownAsSuch)
         EXPECT_EQ(document.toPlainText(), row.shown) << row.reason << ": in the place of what was there";
         EXPECT_EQ(textOf(report), row.text) << row.reason;
     }
+}
+
+TEST(ReportContent, AnOpenedRichTextIsReadWithItsCodePage)
+{
+    const QTemporaryDir folder;
+    const QString path = folder.filePath(QStringLiteral("a.rtf"));
+    putFile(path, "{\\rtf1\\ansi\\ansicpg1251 \xCF\xF0\xE8\r\n}");
+    const FixedSurroundings surroundings;
+    UReportDoc report;
+    report.SetAutoDelete(false);
+    ASSERT_TRUE(report.OnOpenDocument(path));
+    QTextDocument document;
+    EXPECT_FALSE(showReportContent(report, document));
+    EXPECT_TRUE(document.toPlainText().startsWith(QStringLiteral("При"))) << document.toPlainText().toStdString();
+    QTextDocument viewed;
+    EXPECT_FALSE(kareport::readShownRichText(report, kareport::shownText(report), viewed));
+    EXPECT_EQ(viewed.toPlainText(), document.toPlainText()) << "a view reads it in the same way";
+
+    // The image of what is written afterwards is text of its own: a character beyond one byte is not one of a file.
+    report.SetRTFDataFlag(true);
+    report.Write(QStringLiteral("r = \u221E"), 0);
+    viewed.clear();
+    EXPECT_FALSE(kareport::readShownRichText(report, kareport::shownText(report), viewed));
+    EXPECT_TRUE(viewed.toPlainText().contains(u'\u221E')) << viewed.toPlainText().toStdString();
 }
 
 TEST(ReportContent, InRichTextModeTheImageIsShown)

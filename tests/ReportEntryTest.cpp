@@ -22,7 +22,7 @@ std::unique_ptr<UDocTemplate> otherTemplate(const QString &name)
 TEST(ReportEntry, TheReportTemplateIsKnownByItsCreator)
 {
     LoadKaReport();
-    const auto reportTemplate = ReportInitialTemplate();
+    const auto reportTemplate = kareport::makeReportTemplate();
     ASSERT_NE(reportTemplate, nullptr);
     EXPECT_EQ(reportTemplate->GetResourceId(), 27006U);
     EXPECT_TRUE(reportTemplate->IsThatCreator(creator));
@@ -37,9 +37,9 @@ TEST(ReportEntry, TheFirstReportTemplateOfTheApplicationIsFound)
     EXPECT_EQ(GetReportTemplate(), nullptr) << "no template";
     application.AddDocTemplate(otherTemplate(QStringLiteral("OTHER")));
     EXPECT_EQ(GetReportTemplate(), nullptr) << "no template for reports";
-    const UDocTemplate *first = application.AddDocTemplate(ReportInitialTemplate());
+    const UDocTemplate *first = application.AddDocTemplate(kareport::makeReportTemplate());
     EXPECT_EQ(GetReportTemplate(), first);
-    application.AddDocTemplate(ReportInitialTemplate());
+    application.AddDocTemplate(kareport::makeReportTemplate());
     EXPECT_EQ(GetReportTemplate(), first) << "the first of two";
 }
 
@@ -88,7 +88,7 @@ TEST(ReportEntry, WithoutPanesReportsAreMadeWithoutAView)
 {
     const FixedSurroundings surroundings;
     UApplication application;
-    application.AddDocTemplate(ReportInitialTemplate());
+    application.AddDocTemplate(kareport::makeReportTemplate());
     const UReportDoc *report = CreateReport(QStringLiteral("N"), false, false, nullptr, 0, nullptr);
     ASSERT_NE(report, nullptr);
     EXPECT_TRUE(report->GetViews().empty());

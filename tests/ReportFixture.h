@@ -101,8 +101,8 @@ class ReportApplication : public UApplication
 {
 public:
     ReportApplication()
-        : reportTemplate_(AddDocTemplate(ReportInitialTemplate([] { return new CountingPane; },
-                                                               [] { return std::make_unique<TestReportView>(); })))
+        : reportTemplate_(AddDocTemplate(kareport::makeReportTemplate(
+              [] { return new CountingPane; }, [] { return std::make_unique<TestReportView>(); })))
     {}
     ~ReportApplication() override
     {

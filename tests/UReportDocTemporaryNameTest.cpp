@@ -1,59 +1,14 @@
 #include "ReportFixture.h"
+#include "TemporaryFolder.h"
 
 #include <QDir>
 #include <QFile>
 #include <QSet>
-#include <QTemporaryDir>
 
 #include <gtest/gtest.h>
 
 namespace
 {
-
-/// Lets a folder be the system's folder for temporary files. A new one, as names are handed out once while a program runs.
-class TemporaryFolder
-{
-public:
-    explicit TemporaryFolder(const QString &suffix = QString())
-        : unix_(qgetenv("TMPDIR")),
-          windows_(qgetenv("TMP")),
-          isUnixSet_(qEnvironmentVariableIsSet("TMPDIR")),
-          isWindowsSet_(qEnvironmentVariableIsSet("TMP"))
-    {
-        set(folder_.path() + suffix);
-    }
-    ~TemporaryFolder()
-    {
-        restore("TMPDIR", unix_, isUnixSet_);
-        restore("TMP", windows_, isWindowsSet_);
-    }
-    TemporaryFolder(const TemporaryFolder &) = delete;
-    TemporaryFolder &operator=(const TemporaryFolder &) = delete;
-
-    static void set(const QString &path)
-    {
-        qputenv("TMPDIR", path.toLocal8Bit());
-        qputenv("TMP", path.toLocal8Bit());
-    }
-    /// The path of a file in the folder.
-    QString at(const QString &name) const { return folder_.path() + QDir::separator() + name; }
-
-private:
-    static void restore(const char *name, const QByteArray &value, bool isSet)
-    {
-        if (isSet) {
-            qputenv(name, value);
-        } else {
-            qunsetenv(name);
-        }
-    }
-
-    QTemporaryDir folder_;
-    QByteArray unix_;
-    QByteArray windows_;
-    bool isUnixSet_;
-    bool isWindowsSet_;
-};
 
 QString nameFor(const QString &reportFileName)
 {

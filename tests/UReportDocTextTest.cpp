@@ -215,7 +215,7 @@ TEST(UReportDocText, ThePageIsMeasuredOnTheDefaultPrinter)
     EXPECT_EQ(report.GetLinesPerPage(), (6600 - 236 - 472) / (font.height + font.externalLeading));
     EXPECT_EQ(report.GetCharsPerRow(), (5100 - 236 - 283) / font.averageWidth);
 
-    SetReportPrinterToPortrait(false);
+    SetReportPrinterSetToPortrait(false);
     for (const bool portrait : {true, false}) {
         UPreviewDlg::SetModulePrinterOrientationPortrait(portrait);
         EXPECT_EQ(report.SetPageSize(), 1);
@@ -237,7 +237,7 @@ TEST(UReportDocText, WithoutAPrinterThePageKeepsItsFigures)
     const FixedSurroundings surroundings;
     UReportDoc report;
     kareport::setDefaultPrinter({kareport::PrinterSource::None, kareport::PaperSize::A4, 600});
-    SetReportPrinterToPortrait(false);
+    SetReportPrinterSetToPortrait(false);
     EXPECT_EQ(report.SetPageSize(), 0);
     EXPECT_TRUE(UPreviewDlg::IsModulePrinterOrientationPortrait()) << "the orientation is put back";
     EXPECT_EQ(report.GetLinesPerPage(), 72);

@@ -263,6 +263,26 @@ TEST(UReportViewEdit, AnEditOfRichTextPutsThePlainTextIntoTheDocumentAndKeepsThe
     EXPECT_EQ(view.GetWordWrap(), UReportView::WrapNone) << "what the document holds now is plain text";
 }
 
+TEST(UReportViewEdit, AnEditedRichTextIsSavedWithItsFormats)
+{
+    const QTemporaryDir folder;
+    const QString path = folder.filePath(QStringLiteral("a.rtf"));
+    ShownReport t(QStringLiteral("{\\rtf1\\pard\\qc {\\b bold}\\par\\pard\\li720 indented\\par}"));
+    UReportView &view = t.open();
+    QTest::keyClick(&view.GetEdit(), Qt::Key_X);
+    // Saving brings the view up to date first.
+    ASSERT_TRUE(t.report.OnSaveDocument(path));
+    const QByteArray saved = QByteArray::fromStdString(contentOf(path));
+    for (const char *part : {"xbold", "\\b", "\\qc", "\\li720"}) {
+        EXPECT_TRUE(saved.contains(part)) << part << "\n" << saved.toStdString();
+    }
+    t.report.SetData(QStringLiteral("xbold\r\nother"));
+    t.report.UpdateAllViews(nullptr);
+    ASSERT_TRUE(t.report.OnSaveDocument(path));
+    EXPECT_FALSE(QByteArray::fromStdString(contentOf(path)).contains("\\qc"))
+        << "a text that was set from elsewhere has no formats";
+}
+
 TEST(UReportViewEdit, AViewThatShowsAnotherTextTakesTheDocuments)
 {
     ShownReport t;

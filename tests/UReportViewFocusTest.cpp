@@ -107,7 +107,7 @@ TEST(UReportViewFocus, AMousePressMakesAViewTheActiveOne)
     EXPECT_TRUE(desk.views[0]->GetEdit().hasFocus());
 
     desk.views[1]->GetEdit().setFocus();
-    desk.views[0]->OnMousePress();
+    desk.views[0]->OnMouseActivate();
     EXPECT_EQ(desk.frame.GetActiveView(), desk.views[0]);
     EXPECT_TRUE(desk.views[0]->GetEdit().hasFocus()) << "the active view gets the keyboard back";
 }
@@ -129,7 +129,7 @@ TEST(UReportViewFocus, WithoutAFrameOrAnApplicationNothingHappens)
     ShownReport t(QStringLiteral("a"));
     UReportView &view = t.open();
     view.OnSetFocus();
-    view.OnMousePress();
+    view.OnMouseActivate();
     view.OnDestroy();
     QTest::mouseClick(view.GetEdit().viewport(), Qt::LeftButton);
     EXPECT_EQ(view.GetEdit().toPlainText(), QStringLiteral("a"));

@@ -14,7 +14,7 @@ TEST(UReportViewPageSetup, OkStoresMarginsAndOrientation)
             AnsweredPrinting printing;
             ShownReport report;
             UReportView &view = report.open();
-            SetReportPrinterToPortrait(!portrait);
+            SetReportPrinterSetToPortrait(!portrait);
             UPreviewDlg::SetModulePrinterOrientationPortrait(modulePortrait);
             report.report.SetMargins(QMargins(11, 22, 33, 44));
             printing.changeSetup = [portrait](kareport::PageSetup &setup) {
@@ -54,7 +54,7 @@ TEST(UReportViewPageSetup, CancelChangesNothing)
     printing.accept = false;
     ShownReport report;
     UReportView &view = report.open();
-    SetReportPrinterToPortrait(false);
+    SetReportPrinterSetToPortrait(false);
     UPreviewDlg::SetModulePrinterOrientationPortrait(true);
     printing.changeSetup = [](kareport::PageSetup &setup) { setup.margins = QMargins(); };
     report.report.SetMargins(QMargins(11, 22, 33, 44));

@@ -168,7 +168,7 @@ TEST(UReportViewPrint, PrintingUsesTheReportsOrientationAndPutsTheModulesBack)
                 ShownReport report;
                 writeLines(report.report, 3);
                 UReportView &view = report.open();
-                SetReportPrinterToPortrait(reportPortrait);
+                SetReportPrinterSetToPortrait(reportPortrait);
                 UPreviewDlg::SetModulePrinterOrientationPortrait(modulePortrait);
                 view.OnReportPrint();
                 EXPECT_EQ(printing.portraitMeanwhile, reportPortrait);

@@ -22,8 +22,8 @@ CReportToolBar::CReportToolBar(kareport::CommandTarget *owner, QWidget *parent) 
         button->setText(tip);
         button->setToolTip(tip);
         connect(button, &QAction::triggered, this, [this, id] {
-            if (owner_ != nullptr) {
-                owner_->runCommand(id);
+            if (kareport::CommandTarget *asked = target()) {
+                asked->runCommand(id);
             }
         });
         // A person without a mouse reaches the buttons with the Tab key.
@@ -39,11 +39,17 @@ bool CReportToolBar::OnShowControlBarMenu(const QPoint & /*point*/) const
 
 void CReportToolBar::OnUpdateCmdUI(UXTPMDIFrameWnd * /*frame*/, bool /*disableIfNoHandler*/)
 {
+    const kareport::CommandTarget *asked = target();
     for (QAction *button : actions()) {
         kareport::CommandState state;
-        const bool known = owner_ != nullptr && owner_->updateCommand(button->data().toUInt(), state);
+        const bool known = asked != nullptr && asked->updateCommand(button->data().toUInt(), state);
         button->setEnabled(known && state.enabled);
     }
+}
+
+kareport::CommandTarget *CReportToolBar::target() const
+{
+    return owner_ != nullptr ? owner_ : dynamic_cast<kareport::CommandTarget *>(parentWidget());
 }
 
 bool CReportToolBar::OnUserToolTip(const QAction *button, QString &text) const

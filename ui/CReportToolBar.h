@@ -17,7 +17,8 @@ public:
         DockImmediately = 1
     };
 
-    /// @param owner  handles the bar's commands; it must outlive the bar. Null for a bar without commands
+    /// @param owner  handles the bar's commands; it must outlive the bar. Null leaves that to the bar's
+    /// parent, where it handles commands
     explicit CReportToolBar(kareport::CommandTarget *owner, QWidget *parent = nullptr);
 
     /// The bar docks at once, without markers of the places where it could.
@@ -34,5 +35,7 @@ protected:
     void showEvent(QShowEvent *event) override;
 
 private:
+    kareport::CommandTarget *target() const;
+
     kareport::CommandTarget *owner_;
 };

@@ -14,7 +14,7 @@ bool CReportViewPane::CanClosePane()
 
 void CReportViewPane::OnSysCommand(unsigned command, long parameter)
 {
-    const UView *view = GetViews().empty() ? nullptr : GetViews().front().get();
+    const UView *view = GetViews().empty() ? nullptr : GetViews().back().get();
     const bool showsReport = dynamic_cast<const kareport::ReportViewPort *>(view) != nullptr;
     const auto *report = showsReport ? dynamic_cast<const UReportDoc *>(view->GetDocument()) : nullptr;
     if (command == scClose && report != nullptr && !report->EnableCloseOption()) {

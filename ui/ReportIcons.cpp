@@ -6,7 +6,8 @@
 #include <QPainterPath>
 #include <QPalette>
 
-#include <functional>
+#include <algorithm>
+#include <cmath>
 
 namespace kareport
 {
@@ -16,7 +17,9 @@ namespace
 
 /// Icons are drawn on a sheet of 16 units a side.
 constexpr qreal sheet = 16;
-constexpr qreal lineWidth = 1.2;
+constexpr qreal lineWidth = 1;
+/// What the guidelines for accessible graphics ask for.
+constexpr qreal leastContrast = 3;
 
 using Draw = void (*)(QPainter &painter, const QColor &accent);
 
@@ -46,7 +49,7 @@ void drawPage(QPainter &painter, const QColor &accent)
     painter.drawPath(outline);
     painter.drawPolyline(QPolygonF({{9.5, 1.5}, {9.5, 4.5}, {12.5, 4.5}}));
     painter.setPen(QPen(accent, lineWidth));
-    for (const qreal y : {7.0, 9.5, 12.0}) {
+    for (const qreal y : {7.5, 9.5, 11.5}) {
         painter.drawLine(QPointF(5.5, y), QPointF(10.5, y));
     }
 }
@@ -57,6 +60,22 @@ void drawPrinter(QPainter &painter, const QColor &accent)
     painter.drawRoundedRect(QRectF(1.5, 5.5, 13, 6), 1, 1);
     painter.setBrush(accent);
     painter.drawRect(QRectF(4.5, 9.5, 7, 5));
+}
+
+/// How bright a colour is to the eye, from 0 to 1.
+qreal luminance(const QColor &color)
+{
+    const auto linear = [](qreal part) {
+        return part <= 0.04045 ? part / 12.92 : std::pow((part + 0.055) / 1.055, 2.4);
+    };
+    return 0.2126 * linear(color.redF()) + 0.7152 * linear(color.greenF()) + 0.0722 * linear(color.blueF());
+}
+
+/// The contrast of two colours, from 1 to 21.
+qreal contrast(const QColor &a, const QColor &b)
+{
+    const auto [low, high] = std::minmax({luminance(a), luminance(b)});
+    return (high + 0.05) / (low + 0.05);
 }
 
 Draw drawingOf(unsigned command)
@@ -78,7 +97,11 @@ public:
     {
         const QPalette palette = QGuiApplication::palette();
         const auto group = mode == QIcon::Disabled ? QPalette::Disabled : QPalette::Active;
+        // A highlight that is lost on the background, as a dark blue on dark grey, gives way to the text's colour.
         QColor accent = palette.color(group, QPalette::Highlight);
+        if (contrast(accent, palette.color(group, QPalette::Button)) < leastContrast) {
+            accent = palette.color(group, QPalette::ButtonText);
+        }
         if (mode == QIcon::Disabled) {
             accent = palette.color(group, QPalette::Mid);
         }

@@ -1,57 +1,24 @@
 #pragma once
 
 #include "KaReportExport.h"
+#include "PageSetupForm.h"
 
 #include <QDialog>
-#include <QMargins>
-#include <QSizeF>
-#include <QString>
-#include <QStringList>
-
-#include <array>
-#include <functional>
-
-class QComboBox;
-class QDoubleSpinBox;
-class QLabel;
-class QRadioButton;
 
 namespace kareport
 {
 
-/// What a page is set up with.
-struct PageSetup
-{
-    QMargins margins; ///< hundredths of a millimetre
-    bool portrait = true;
-    QString printer;                                ///< empty for the built-in page device
-    QStringList printers;                           ///< to choose from
-    std::function<QSizeF(const QString &)> sheetOf; ///< the upright sheet of a printer in millimetres
-};
-
-/// Asks for paper orientation, margins and, where there are several, the printer. It is not left with OK while the margins
-/// leave no room for text.
+/// Asks for the set-up of a page. It is not left with OK while the margins leave no room for text.
 class KAREPORT_EXPORT PageSetupDialog : public QDialog
 {
 public:
     explicit PageSetupDialog(const PageSetup &setup, QWidget *parent = nullptr);
 
-    /// What the user has chosen; the rest as it was given.
-    PageSetup setup() const;
+    PageSetup setup() const { return form_->setup(); }
     void accept() override;
 
 private:
-    bool leavesRoom() const;
-    void showSheet();
-    void checkMargins();
-
-    PageSetup setup_;
-    QRadioButton *portrait_;
-    QRadioButton *landscape_;
-    QComboBox *printer_;
-    QLabel *sheet_;
-    QLabel *warning_;
-    std::array<QDoubleSpinBox *, 4> margins_ = {}; ///< left, top, right, bottom
+    PageSetupForm *form_;
 };
 
 } // namespace kareport

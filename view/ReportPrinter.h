@@ -1,6 +1,7 @@
 #pragma once
 
-#include "PageSetupDialog.h"
+#include "KaReportExport.h"
+#include "PageSetupForm.h"
 
 #include <QSize>
 #include <QString>
@@ -21,8 +22,8 @@ std::shared_ptr<QPrinter> makeReportPrinter(bool portrait, const QString &title)
 QSize sheetInTwips(const QPrinter &printer);
 
 /// The printers to choose from, and the one that is chosen.
-void fillPrinters(PageSetup &setup);
+KAREPORT_EXPORT void fillPrinters(PageSetup &setup);
 /// Makes an installed printer the one that the application prints on.
-void selectPrinter(const QString &name);
+KAREPORT_EXPORT void selectPrinter(const QString &name);
 
 } // namespace kareport

@@ -75,8 +75,8 @@ ReportViewWidget::ReportViewWidget(QWidget *parent)
     edit_->setZoomHandler([this] { showZoom(); });
     connect(edit_, &QPlainTextEdit::cursorPositionChanged, this, [this] { showPlace(); });
     connect(edit_, &QPlainTextEdit::blockCountChanged, this, [this] { showPlace(); });
-    for (QWidget *child : {edit_->viewport(), static_cast<QWidget *>(&findBar_->field())}) {
-        child->installEventFilter(this);
+    for (QWidget *child : findChildren<QWidget *>()) {
+        child->installEventFilter(this); // wherever the mouse is pressed
     }
     showPlace();
     showZoom();

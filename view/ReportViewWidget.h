@@ -32,7 +32,7 @@ public:
 
     /// Where the lines of a page are asked for; 72 without.
     void setLinesPerPage(std::function<int()> linesPerPage);
-    /// Called when the mouse is pressed in the text or in a bar.
+    /// Called when the mouse is pressed anywhere in it.
     void setPressHandler(std::function<void()> handler) { pressed_ = std::move(handler); }
 
     void openFindBar();
@@ -45,6 +45,8 @@ public:
     int currentPage() const; ///< from 1
     /// Puts the cursor at the beginning of a page and shows it at the top. @param page  brought into 1 to `pageCount`
     void goToPage(int page);
+    /// Shows page, line and column again, after the lines of a page have changed.
+    void showPlace();
 
 protected:
     bool event(QEvent *event) override;
@@ -57,7 +59,6 @@ private:
     Action actionOfKey(const QKeyEvent &event) const;
     void closeBar();
     int linesPerPage() const;
-    void showPlace();
     void showZoom();
 
     ReportEdit *edit_;

@@ -32,7 +32,7 @@ UReportView::UReportView()
     widget_ = widget;
     edit_ = &widget->edit();
     widget->setLinesPerPage([this] { return GetDocument() != nullptr ? GetDocument()->GetLinesPerPage() : 0; });
-    widget->setPressHandler([this] { OnMousePress(); });
+    widget->setPressHandler([this] { OnMouseActivate(); });
     edit_->setFocusHandler([this] { OnSetFocus(); });
     edit_->setEditHandler([this](const ReportChange &change) { takeEdit(change); });
     commands_ = makeCommands();
@@ -116,7 +116,7 @@ void UReportView::UpdateData(bool toView)
     }
     if (!toView) {
         report->SetData(edit_->windowText());
-        isMirrored_ = report->GetTextLength() == edit_->windowTextLength();
+        noteMirrored();
         report->UpdateAllViews(this, 0, nullptr);
         return;
     }
@@ -127,15 +127,28 @@ void UReportView::UpdateData(bool toView)
         WrapChanged();
     }
     SetRTFText(text);
+    if (!report->GetRTFDataFlag() && wrap == WrapNone) {
+        noteMirrored();
+    }
+}
+
+void UReportView::noteMirrored()
+{
     // A line end of one character in the document makes the lengths differ: only texts whose lines all end with CR LF
     // are as long there as here.
-    isMirrored_ = !report->GetRTFDataFlag() && wrap == WrapNone && report->GetTextLength() == edit_->windowTextLength();
+    const UReportDoc *report = GetDocument();
+    isMirrored_ = report->GetTextLength() == edit_->windowTextLength();
+    mirroredEdits_ = report->GetEditCount();
 }
 
 void UReportView::SetRTFText(const QString &text)
 {
     isMirrored_ = false;
-    if (kareport::isRichText(text)) {
+    if (showsFormats_ && text == edit_->windowText()) {
+        return; // what was edited here has come back as the document's text: its formats stand in the control alone
+    }
+    showsFormats_ = kareport::isRichText(text);
+    if (showsFormats_) {
         const UReportDoc *report = GetDocument();
         edit_->loadRichText([report, &text](QTextDocument &loaded) {
             return report != nullptr ? kareport::readShownRichText(*report, text, loaded)
@@ -150,7 +163,9 @@ void UReportView::OnChange()
 {
     if (UReportDoc *report = GetDocument()) {
         UpdateData(false);
-        report->SetModifiedFlag(true);
+        if (UReportDoc::IsReportAvailable(report)) { // an editor that takes it may have closed it
+            report->SetModifiedFlag(true);
+        }
     }
 }
 
@@ -161,32 +176,29 @@ void UReportView::takeEdit(const ReportChange &change)
         return;
     }
     const bool isReplaced =
-        isMirrored_ && report->GetTextLength() == change.documentLengthBefore() &&
+        isMirrored_ && report->GetEditCount() == mirroredEdits_ &&
+        report->GetTextLength() == change.documentLengthBefore() &&
         report->ReplaceText(change.documentPosition(), change.documentRemoved(), change.documentInserted());
     if (!isReplaced) {
         // Rich text, other line ends, or a text that was changed behind the view's back: the document takes over what
         // the control shows, and every further edit as the change it is.
         report->SetData(edit_->windowText());
-        isMirrored_ = report->GetTextLength() == edit_->windowTextLength();
         report->SetModifiedFlag(true);
     }
+    noteMirrored();
     ReportChange handedOn = change;
     report->UpdateAllViews(this, ReportChange::hint, &handedOn);
 }
 
 void UReportView::followEdit(const ReportChange &change)
 {
-    if (edit_->applyChange(change)) {
+    // A view that shows formats, or an image, shows another text than the one that was edited: what the document holds now
+    // is plain.
+    if (!showsFormats_ && edit_->applyChange(change)) {
+        noteMirrored();
         return;
     }
-    // This view shows another text than the one that was edited, such as the image of a report in rich-text mode. The
-    // edited text is the document's.
-    if (const UReportDoc *report = GetDocument()) {
-        m_nWordWrap = WrapNone;
-        WrapChanged();
-        edit_->loadPlainText(report->CopyText());
-        isMirrored_ = report->GetTextLength() == edit_->windowTextLength();
-    }
+    OnUpdate(nullptr, 0, nullptr);
 }
 
 void UReportView::OnSetFocus()
@@ -208,10 +220,15 @@ void UReportView::OnSetFocus()
     }
 }
 
-void UReportView::OnMousePress()
+void UReportView::OnMouseActivate()
 {
+    // A pane that floats is still the frame's.
+    const QWidget *ancestor = widget_;
+    while (ancestor != nullptr && dynamic_cast<const UXTPMDIFrameWnd *>(ancestor) == nullptr) {
+        ancestor = ancestor->parentWidget();
+    }
     UXTPMDIFrameWnd *frame = UXTPMDIFrameWnd::Get();
-    if (frame == nullptr || !widget_) {
+    if (frame == nullptr || ancestor != frame) {
         return;
     }
     const QWidget *focus = QApplication::focusWidget();

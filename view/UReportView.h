@@ -32,6 +32,7 @@ struct PrintInfo
     QPrinter *printer = nullptr; ///< null until a printer has been prepared
     int curPage = 1;             ///< the page that is printed now, from 1
     int maxPage = 0;             ///< the last page; 0 when there is none
+    bool direct = false;         ///< nobody is asked for printer and pages
     bool preview = false;        ///< shown on the screen: nobody is asked for printer and pages
     /// The printer, where it has been prepared for the job and not been given.
     std::shared_ptr<QPrinter> ownPrinter;
@@ -57,6 +58,8 @@ public:
     /// The control that holds the text.
     kareport::ReportEdit &GetEdit() const;
     WordWrap GetWordWrap() const { return m_nWordWrap; }
+    /// Whether the text was rich text when it was loaded: its formats may then stand in the control alone.
+    bool ShowsFormats() const { return showsFormats_; }
 
     /// Gives the control its font. @return 0, or -1 when it cannot be made
     int OnCreate();
@@ -69,19 +72,22 @@ public:
     /// Takes over the whole text of the control.
     void OnChange();
     void OnSetFocus();
-    /// A press of the mouse in the control makes the view the active one.
-    void OnMousePress();
+    /// A press of the mouse in the view's window makes the view the active one of the frame that it stands in.
+    void OnMouseActivate();
     void OnDestroy();
     /// Closes the application, and the report's window with it.
     void OnReportExit();
     void OnSaveReportText();
+    /// The report can be closed unless its close option is off.
+    void OnUpdateCloseCmdUI(kareport::CommandState &state) const;
 
     bool streamRichText(QIODevice &device) const override;
     bool streamPlainText(QIODevice &device) const override;
     const std::vector<kareport::Command> &commands() const override;
 
     // Printing
-    void OnReportPrint();
+    /// @param direct  prints on the prepared printer without asking for printer and pages
+    void OnReportPrint(bool direct = false);
     void OnReportPrintPreview();
     void OnPageSetup();
     /// Prepares a job: page count, margins, paper, printer. @return false cancels it
@@ -104,6 +110,7 @@ public:
 
 private:
     void WrapChanged();
+    void noteMirrored();
     QRect printableRect() const; ///< twips
     kareport::LinePager makePager(QPaintDevice &device) const;
     std::vector<kareport::Command> makeCommands();
@@ -115,6 +122,8 @@ private:
     std::vector<kareport::Command> commands_;
     WordWrap m_nWordWrap = WrapNone;
     bool isMirrored_ = false; ///< whether the document holds the control's text, its lines ended by CR LF
+    quint64 mirroredEdits_ = 0; ///< the document's edits by then
+    bool showsFormats_ = false; ///< whether the control's text was rich text
     QMargins m_rectMargin;    ///< twips
     QSize m_sizePaper;        ///< twips
     std::vector<qint64> m_aPageStart;

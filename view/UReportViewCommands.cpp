@@ -29,22 +29,25 @@ const std::vector<Command> &UReportView::commands() const
     return widget_ ? commands_ : none; // they act on the window
 }
 
+void UReportView::OnUpdateCloseCmdUI(CommandState &state) const
+{
+    state.enabled = GetDocument() == nullptr || GetDocument()->EnableCloseOption();
+}
+
 std::vector<Command> UReportView::makeCommands()
 {
     using namespace kareport;
     const auto print = [this] { OnReportPrint(); };
     const auto preview = [this] { OnReportPrintPreview(); };
     const auto alwaysEnabled = [](CommandState &state) { state.enabled = true; };
-    const auto closeState = [this](CommandState &state) {
-        state.enabled = GetDocument() == nullptr || GetDocument()->EnableCloseOption();
-    };
+    const auto closeState = [this](CommandState &state) { OnUpdateCloseCmdUI(state); };
     ReportEdit &edit = GetEdit();
     auto *widget = static_cast<ReportViewWidget *>(widget_.data());
     return {
         {filePrintCommand, print, alwaysEnabled},
         {printPreviewCommand, preview, {}},
         {hostPrintCommand, print, alwaysEnabled},
-        {printDirectCommand, print, alwaysEnabled},
+        {printDirectCommand, [this] { OnReportPrint(true); }, alwaysEnabled},
         {hostPrintPreviewCommand, preview, {}},
         {pageSetupCommand, [this] { OnPageSetup(); }, {}},
         {exitCommand, [this] { OnReportExit(); }, {}},

@@ -9,6 +9,7 @@
 #include "PrintJob.h"
 #include "ReportEdit.h"
 #include "ReportPrinter.h"
+#include "ReportViewWidget.h"
 #include "UPreviewDlg.h"
 #include "UReportDoc.h"
 #include "Xlate.h"
@@ -68,6 +69,11 @@ private:
     UReportView &view_;
 };
 
+void sayNoRoom()
+{
+    AppMessageBox(Xlate("The margins leave no room for text on the paper. Choose smaller margins under Page Setup."));
+}
+
 /// Matches the page model with the printer. @return false, having said so, when the page has no room for text
 bool hasRoom(UReportDoc &report)
 {
@@ -78,7 +84,7 @@ bool hasRoom(UReportDoc &report)
     if (kareport::leavesRoom(sheet, kareport::twipsOfHundredths(report.GetMargins()))) {
         return true;
     }
-    AppMessageBox(Xlate("The margins leave no room for text on the paper. Choose smaller margins under Page Setup."));
+    sayNoRoom();
     return false;
 }
 
@@ -136,13 +142,14 @@ QString nameOf(const QPrinter &printer)
 
 } // namespace
 
-void UReportView::OnReportPrint()
+void UReportView::OnReportPrint(bool direct)
 {
     if (GetDocument() != nullptr && !hasRoom(*GetDocument())) {
         return;
     }
     const ReportOrientation orientation;
     PrintInfo info;
+    info.direct = direct;
     if (OnPreparePrinting(info)) {
         const QString name = nameOf(*info.printer);
         sayOutcome(printText(*this, *info.printer, info, 0), name);
@@ -207,12 +214,16 @@ bool UReportView::OnPreparePrinting(PrintInfo &info)
     }
     const PrintedText text(*this);
     const QSize sheet = kareport::sheetInTwips(*info.printer);
-    if (!kareport::askPrint(*info.printer, info.maxPage, GetWidget()) || !text.isOpen()) {
+    if (!info.direct && (!kareport::askPrint(*info.printer, info.maxPage, GetWidget()) || !text.isOpen())) {
         return false;
     }
     info.printer->setFullPage(true);
     if (kareport::sheetInTwips(*info.printer) != sheet) {
         m_sizePaper = kareport::sheetInTwips(*info.printer); // another one was chosen for this job
+    }
+    if (!kareport::leavesRoom(m_sizePaper, m_rectMargin)) {
+        sayNoRoom();
+        return false;
     }
     return true;
 }
@@ -251,8 +262,8 @@ void UReportView::OnPrint(QPainter &painter, PrintInfo &info)
     const qint64 next = PrintPage(painter, start, -1);
     if (next >= GetEdit().document()->characterCount() - 1) {
         info.maxPage = info.curPage;
-    } else if (info.curPage == pages) {
-        m_aPageStart.push_back(next);
+    } else if (info.curPage == pages && next > start) {
+        m_aPageStart.push_back(next); // a page that takes nothing would be followed by others for ever
     }
 }
 
@@ -303,6 +314,7 @@ void UReportView::OnPageSetup()
     report->SetMargins(setup.margins);
     report->SetPageSize();
     report->SaveSettings();
+    static_cast<kareport::ReportViewWidget *>(GetWidget())->showPlace();
     // After the measurement, which the next print command repeats: the report that is open keeps its pages till then.
-    SetReportPrinterToPortrait(UPreviewDlg::IsModulePrinterOrientationPortrait());
+    SetReportPrinterSetToPortrait(UPreviewDlg::IsModulePrinterOrientationPortrait());
 }

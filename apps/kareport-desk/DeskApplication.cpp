@@ -1,9 +1,8 @@
 #include "DeskApplication.h"
 
-#include "CReportViewPane.h"
+#include "DeskFrame.h"
 #include "Profile.h"
-#include "ReportEntry.h"
-#include "UReportView.h"
+#include "ReportInitialTemplate.h"
 
 #include <QFileInfo>
 
@@ -19,8 +18,7 @@ QString recentEntry(qsizetype number)
 
 DeskApplication::DeskApplication()
 {
-    AddDocTemplate(
-        ReportInitialTemplate([] { return new CReportViewPane; }, [] { return std::make_unique<UReportView>(); }));
+    AddDocTemplate(ReportInitialTemplate());
     QStringList files;
     for (qsizetype number = 1; !GetProfileString(QString(), recentEntry(number)).isEmpty(); ++number) {
         files.prepend(GetProfileString(QString(), recentEntry(number)));
@@ -35,5 +33,12 @@ void DeskApplication::AddToRecentFileList(const QString &path)
     UApplication::AddToRecentFileList(QFileInfo(path).absoluteFilePath());
     for (qsizetype i = 0; i < GetRecentFileList().size(); ++i) {
         WriteProfileString(QString(), recentEntry(i + 1), GetRecentFileList().at(i));
+    }
+}
+
+void DeskApplication::OnDocumentEvent(UDocument &document, UDocument::DocumentEvent event)
+{
+    if (auto *frame = dynamic_cast<DeskFrame *>(UXTPMDIFrameWnd::Get())) {
+        frame->NoteDocumentEvent(document, event);
     }
 }

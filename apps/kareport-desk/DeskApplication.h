@@ -9,4 +9,5 @@ public:
     DeskApplication();
 
     void AddToRecentFileList(const QString &path) override;
+    void OnDocumentEvent(UDocument &document, UDocument::DocumentEvent event) override;
 };

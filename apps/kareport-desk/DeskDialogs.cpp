@@ -14,17 +14,25 @@ namespace kareport
 namespace
 {
 
+QMessageBox::StandardButtons boxButtons(MessageButtons buttons)
+{
+    switch (buttons) {
+    case MessageButtons::YesNo: return QMessageBox::Yes | QMessageBox::No;
+    case MessageButtons::YesNoCancel: return QMessageBox::Yes | QMessageBox::No | QMessageBox::Cancel;
+    default: return QMessageBox::Ok;
+    }
+}
+
 MessageAnswer showBox(QWidget *parent, const Message &message)
 {
     QMessageBox box(parent);
     box.setWindowTitle(message.caption.isEmpty() ? QCoreApplication::applicationName() : message.caption);
     box.setText(message.text);
-    const bool isQuestion = message.buttons == MessageButtons::YesNoCancel;
+    const bool isQuestion = message.icon == MessageIcon::Question || message.buttons != MessageButtons::Ok;
     box.setIcon(message.icon == MessageIcon::Information ? QMessageBox::Information
                 : isQuestion                             ? QMessageBox::Question
                                                          : QMessageBox::Warning);
-    box.setStandardButtons(isQuestion ? QMessageBox::Yes | QMessageBox::No | QMessageBox::Cancel
-                                      : QMessageBox::StandardButtons(QMessageBox::Ok));
+    box.setStandardButtons(boxButtons(message.buttons));
     switch (box.exec()) {
     case QMessageBox::Ok: return MessageAnswer::Ok;
     case QMessageBox::Yes: return MessageAnswer::Yes;

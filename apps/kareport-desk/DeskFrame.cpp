@@ -1,169 +1,79 @@
 #include "DeskFrame.h"
 
 #include "AppMessageBox.h"
-#include "COneViewPane.h"
 #include "Folders.h"
 #include "JobLauncher.h"
-#include "Profile.h"
+#include "PreferencesDialog.h"
 #include "ReportEntry.h"
-#include "ReportResources.h"
+#include "TemplateDialog.h"
 #include "UApplication.h"
 #include "UReportDoc.h"
 #include "UView.h"
 #include "Xlate.h"
 
 #include <QCloseEvent>
-#include <QDockWidget>
 #include <QDragEnterEvent>
 #include <QFileDialog>
 #include <QFileInfo>
-#include <QMenuBar>
 #include <QMessageBox>
 #include <QMimeData>
 #include <QStatusBar>
-#include <QToolBar>
+#include <QTimer>
 
 namespace
 {
 
-enum CommandId : unsigned
-{
-    fileNew = 57600,
-    fileOpen = 57601,
-    fileClose = 57602,
-    fileSave = 57603,
-    fileSaveAs = 57604,
-    filePageSetup = 57606,
-    filePrint = 57607,
-    filePrintPreview = 57609,
-    editCopy = 57634,
-    editCut = 57635,
-    editFind = 57636,
-    editPaste = 57637,
-    editSelectAll = 57642,
-    editUndo = 57643,
-    windowNew = 57648,
-    windowArrange = 57649,
-    windowCascade = 57650,
-    windowTileHorizontally = 57651,
-    windowTileVertically = 57652,
-    helpAbout = 57664,
-    appExit = 57665,
-    helpContents = 57670,
-    viewToolBar = 59392,
-    viewStatusBar = 59393,
-    updateText = 32771
-};
-
 const QString lastFolderEntry = QStringLiteral("LastOpenDirectoryReport");
-const QString layoutEntry = QStringLiteral("Window Layout");
-const QString geometryEntry = QStringLiteral("Window Geometry");
+
+std::vector<UDocument *> openDocuments()
+{
+    std::vector<UDocument *> documents;
+    for (const auto &docTemplate : UApplication::Get()->GetDocTemplates()) {
+        documents.insert(documents.end(), docTemplate->GetDocuments().begin(), docTemplate->GetDocuments().end());
+    }
+    return documents;
+}
+
+bool isOpen(const UDocument *document)
+{
+    const auto documents = openDocuments();
+    return std::find(documents.begin(), documents.end(), document) != documents.end();
+}
 
 } // namespace
 
-DeskFrame::DeskFrame()
+DeskFrame::DeskFrame() : files_([this](const QString &path) { fileChanged(path); })
 {
     commands_ = makeCommands();
     setWindowTitle(Xlate("KaReport"));
     setAcceptDrops(true);
-    resize(1000, 760);
+    constexpr QSize usualSize(1000, 760);
+    resize(usualSize);
     makeMenus();
     statusBar()->showMessage(Xlate("Open a job or a saved report, or drop it here."));
     askFile = [this]() -> std::optional<QString> {
-        const QString path = QFileDialog::getOpenFileName(this, Xlate("Open"), GetInitialOpenDir(lastFolderEntry),
-                                                          Xlate("Reports and jobs (*.rep *.rtf *.json)") +
-                                                              QStringLiteral(";;") + Xlate("All files (*)"));
+        const QString path =
+            QFileDialog::getOpenFileName(this, Xlate("Open"), GetInitialOpenDir(lastFolderEntry),
+                                         Xlate("Reports, jobs and templates (*.rep *.rtf *.json *.xml)") +
+                                             QStringLiteral(";;") + Xlate("All files (*)"));
         return path.isEmpty() ? std::nullopt : std::optional(path);
+    };
+    askTemplate = [this](const QString &templateFile) -> std::optional<kareport::TemplateJob> {
+        kareport::TemplateDialog dialog(this);
+        if (!templateFile.isEmpty()) {
+            dialog.setTemplateFile(templateFile);
+        }
+        return dialog.exec() == QDialog::Accepted ? std::optional(dialog.job()) : std::nullopt;
     };
     loadLayout();
     UpdateCommands();
+    constexpr int keepInterval = 5000; // milliseconds
+    auto *timer = new QTimer(this);
+    connect(timer, &QTimer::timeout, this, [this] { recovery_.keep(); });
+    timer->start(keepInterval);
 }
 
 DeskFrame::~DeskFrame() = default;
-
-std::vector<kareport::Command> DeskFrame::makeCommands()
-{
-    const auto hasReport = [this](kareport::CommandState &state) { state.enabled = activeDocument() != nullptr; };
-    return {
-        {fileNew, [this] { newReport(); }, {}},
-        {fileOpen, [this] { open(); }, {}},
-        {appExit, [this] { close(); }, {}},
-        {windowNew, [this] { newWindow(); }, hasReport},
-        {windowCascade, [this] { cascade(); }, hasReport},
-        {windowArrange, [this] { cascade(); }, hasReport},
-        {windowTileHorizontally, [this] { arrange(Qt::Vertical); }, hasReport},
-        {windowTileVertically, [this] { arrange(Qt::Horizontal); }, hasReport},
-        {viewToolBar, [this] { toolBar_->setVisible(!toolBar_->isVisible()); },
-         [this](kareport::CommandState &state) { state.checked = toolBar_->isVisible(); }},
-        {viewStatusBar, [this] { statusBar()->setVisible(!statusBar()->isVisible()); },
-         [this](kareport::CommandState &state) { state.checked = statusBar()->isVisible(); }},
-        {helpAbout, [this] { about(); }, {}},
-        {helpContents, [this] { about(); }, {}},
-    };
-}
-
-void DeskFrame::makeMenus()
-{
-    QMenu *file = menuBar()->addMenu(Xlate("&File"));
-    AddCommand(*file, fileNew, Xlate("&New\tCtrl+N"));
-    AddCommand(*file, fileOpen, Xlate("&Open...\tCtrl+O"));
-    AddCommand(*file, fileClose, Xlate("&Close\tCtrl+W"));
-    AddCommand(*file, fileSave, Xlate("&Save\tCtrl+S"))->setIcon(kareport::reportIcon(kareport::commandSaveReport));
-    AddCommand(*file, fileSaveAs, Xlate("Save &As...\tCtrl+Shift+S"));
-    AddCommand(*file, updateText, Xlate("Update Text"));
-    file->addSeparator();
-    AddCommand(*file, filePrint, Xlate("&Print...\tCtrl+P"))
-        ->setIcon(kareport::reportIcon(kareport::commandPrintReport));
-    AddCommand(*file, filePrintPreview, Xlate("Print Pre&view"));
-    AddCommand(*file, filePageSetup, Xlate("Pa&ge Setup..."));
-    file->addSeparator();
-    recentFiles_ = file->addMenu(Xlate("Recent File"));
-    connect(file, &QMenu::aboutToShow, this, [this] { fillRecentFiles(); });
-    file->addSeparator();
-    AddCommand(*file, appExit, Xlate("E&xit\tCtrl+Q"));
-
-    QMenu *edit = menuBar()->addMenu(Xlate("&Edit"));
-    AddCommand(*edit, editUndo, Xlate("&Undo\tCtrl+Z"));
-    edit->addSeparator();
-    AddCommand(*edit, editCut, Xlate("Cu&t\tCtrl+X"));
-    AddCommand(*edit, editCopy, Xlate("&Copy\tCtrl+C"));
-    AddCommand(*edit, editPaste, Xlate("&Paste\tCtrl+V"));
-    AddCommand(*edit, editSelectAll, Xlate("Select &All\tCtrl+A"));
-    edit->addSeparator();
-    AddCommand(*edit, editFind, Xlate("&Find...\tCtrl+F"));
-
-    QMenu *view = menuBar()->addMenu(Xlate("&View"));
-    AddCommand(*view, viewToolBar, Xlate("&Toolbar"))->setCheckable(true);
-    AddCommand(*view, viewStatusBar, Xlate("&Status Bar"))->setCheckable(true);
-
-    QMenu *window = menuBar()->addMenu(Xlate("&Window"));
-    AddCommand(*window, windowNew, Xlate("&New Window"));
-    AddCommand(*window, windowCascade, Xlate("&Cascade"));
-    AddCommand(*window, windowTileHorizontally, Xlate("&Tile Horizontally"));
-    AddCommand(*window, windowTileVertically, Xlate("Tile &Vertically"));
-    AddCommand(*window, windowArrange, Xlate("&Arrange Icons"));
-
-    QMenu *help = menuBar()->addMenu(Xlate("&Help"));
-    AddCommand(*help, helpContents, Xlate("&Help\tF1"));
-    AddCommand(*help, helpAbout, Xlate("&About..."));
-
-    toolBar_ = addToolBar(Xlate("Toolbar"));
-    toolBar_->setObjectName(QStringLiteral("toolbar"));
-    toolBar_->addAction(CommandAction(fileSave));
-    toolBar_->addAction(CommandAction(filePrint));
-}
-
-void DeskFrame::fillRecentFiles()
-{
-    recentFiles_->clear();
-    const QStringList files = UApplication::Get()->GetRecentFileList();
-    recentFiles_->setEnabled(!files.isEmpty());
-    int number = 0;
-    for (const QString &path : files) {
-        recentFiles_->addAction(QStringLiteral("&%1 %2").arg(++number % 10).arg(path), this,
-                                [this, path] { OpenFile(path); });
-    }
-}
 
 UDocument *DeskFrame::activeDocument() const
 {
@@ -193,21 +103,23 @@ void DeskFrame::open()
     }
 }
 
-bool DeskFrame::OpenFile(const QString &path)
+void DeskFrame::fromTemplate(const QString &templateFile)
 {
-    UDocument *report = nullptr;
-    QString error;
-    if (path.endsWith(u".json", Qt::CaseInsensitive)) {
-        report = kareport::launchJob(path, this, error);
-        if (report != nullptr) {
-            UApplication::Get()->AddToRecentFileList(path);
-        }
-    } else if (!QFileInfo(path).isFile()) {
-        error = Xlate("There is no file \"%1\".").arg(path);
-    } else {
-        report = GetReportTemplate()->OpenReportDocumentFile(path, 1, 1, nullptr, 0, nullptr);
-        error = report == nullptr ? Xlate("\"%1\" could not be opened.").arg(path) : QString();
+    if (const auto job = askTemplate(templateFile)) {
+        OpenTemplateJob(*job);
     }
+}
+
+void DeskFrame::askPreferences()
+{
+    kareport::PreferencesDialog dialog(kareport::loadPreferences(), this);
+    if (dialog.exec() == QDialog::Accepted) {
+        kareport::savePreferences(dialog.preferences());
+    }
+}
+
+bool DeskFrame::finishOpening(UDocument *report, const QString &error)
+{
     if (!error.isEmpty()) {
         kareport::showMessage({error, QString(), MessageButtons::Ok, kareport::MessageIcon::None});
     }
@@ -218,37 +130,112 @@ bool DeskFrame::OpenFile(const QString &path)
     return report != nullptr;
 }
 
-void DeskFrame::newWindow()
+bool DeskFrame::OpenTemplateJob(const kareport::TemplateJob &job)
 {
-    UDocument *document = activeDocument();
-    if (CViewPane *pane = GetReportTemplate()->CreateNewPane(document, nullptr, 0, nullptr)) {
-        GetReportTemplate()->InitialUpdatePane(pane, document, 1);
+    QString error;
+    UDocument *report = kareport::launchTemplateJob(job, this, error);
+    return finishOpening(report, error);
+}
+
+bool DeskFrame::OpenFile(const QString &path)
+{
+    if (path.endsWith(u".xml", Qt::CaseInsensitive)) {
+        fromTemplate(path);
+        return true;
+    }
+    UDocument *report = nullptr;
+    QString error;
+    if (path.endsWith(u".json", Qt::CaseInsensitive)) {
+        report = kareport::launchJob(path, this, error);
+        if (report != nullptr) {
+            UApplication::Get()->AddToRecentFileList(path);
+        }
+    } else if (!QFileInfo(path).isFile()) {
+        error = Xlate("There is no file \"%1\".").arg(path);
+    } else {
+        const QString file = QFileInfo(path).absoluteFilePath();
+        report = GetReportTemplate()->OpenReportDocumentFile(file, 1, 1, nullptr, 0, nullptr);
+        error = report == nullptr ? Xlate("\"%1\" could not be opened.").arg(path) : QString();
+    }
+    return finishOpening(report, error);
+}
+
+void DeskFrame::OfferLeftReports()
+{
+    const std::vector<kareport::KeptReport> left = recovery_.leftReports();
+    QStringList names;
+    for (const kareport::KeptReport &kept : left) {
+        names.append(kept.title + (kept.textFile.isEmpty() ? QString() : Xlate(" (with changes that were not saved)")));
+    }
+    if (!left.empty()) {
+        const MessageAnswer answer = kareport::showMessage(
+            {Xlate("KaReport did not end properly the last time. These reports were open:\n\n%1\n\nOpen them again?")
+                 .arg(names.join(u'\n')),
+             QString(), MessageButtons::YesNo, kareport::MessageIcon::Question});
+        if (answer != MessageAnswer::Yes && answer != MessageAnswer::No) {
+            return; // they are offered again at the next start
+        }
+        for (const kareport::KeptReport &kept : left) {
+            if (answer == MessageAnswer::Yes) {
+                if (UReportDoc *report = kareport::Recovery::reopen(kept)) {
+                    activate(report);
+                }
+            }
+        }
+        recovery_.keep();
+    }
+    recovery_.discardLeft();
+}
+
+void DeskFrame::NoteDocumentEvent(UDocument &document, UDocument::DocumentEvent event)
+{
+    if (event == UDocument::DocumentEvent::AfterCloseDocument) {
+        files_.forget(document.GetPathName());
+        recovery_.forget(dynamic_cast<const UReportDoc *>(&document));
+        return;
+    }
+    // A document that has just been opened or saved under a new name gets its path behind the event.
+    QMetaObject::invokeMethod(
+        this,
+        [this, &document] {
+            if (isOpen(&document) && !document.GetPathName().isEmpty()) {
+                files_.watch(document.GetPathName());
+            }
+        },
+        Qt::QueuedConnection);
+}
+
+void DeskFrame::fileChanged(const QString &path)
+{
+    for (UDocument *document : openDocuments()) {
+        if (document->GetPathName() != path) {
+            continue;
+        }
+        const QString question =
+            document->IsModified()
+                ? Xlate("\"%1\" was changed by another program, and it has changes here that are not saved. "
+                        "Load it again and lose the changes made here?")
+                : Xlate("\"%1\" was changed by another program. Load it again?");
+        const MessageAnswer answer = kareport::showMessage(
+            {question.arg(path), QString(), MessageButtons::YesNo, kareport::MessageIcon::Question});
+        if (answer == MessageAnswer::Yes && isOpen(document)) {
+            reload(*document);
+        }
+        return;
     }
 }
 
-void DeskFrame::arrange(Qt::Orientation orientation)
+void DeskFrame::reload(UDocument &document)
 {
-    QDockWidget *last = nullptr;
-    for (QDockWidget *dock : findChildren<QDockWidget *>(QString(), Qt::FindDirectChildrenOnly)) {
-        dock->setFloating(false);
-        if (last == nullptr) {
-            addDockWidget(Qt::TopDockWidgetArea, dock);
-        } else {
-            splitDockWidget(last, dock, orientation);
-        }
-        last = dock;
+    const QString path = document.GetPathName();
+    if (auto *report = dynamic_cast<UReportDoc *>(&document)) {
+        report->Clear();
     }
-}
-
-void DeskFrame::cascade()
-{
-    QDockWidget *last = nullptr;
-    for (QDockWidget *dock : findChildren<QDockWidget *>(QString(), Qt::FindDirectChildrenOnly)) {
-        dock->setFloating(false);
-        if (last != nullptr) {
-            tabifyDockWidget(last, dock);
-        }
-        last = dock;
+    const bool isLoaded = document.OnOpenDocument(path);
+    document.UpdateAllViews(nullptr, 0, nullptr);
+    if (!isLoaded) {
+        kareport::showMessage({Xlate("\"%1\" could not be opened.").arg(path), QString(), MessageButtons::Ok,
+                               kareport::MessageIcon::None});
     }
 }
 
@@ -262,12 +249,10 @@ void DeskFrame::about()
 
 void DeskFrame::closeEvent(QCloseEvent *event)
 {
-    for (const auto &docTemplate : UApplication::Get()->GetDocTemplates()) {
-        for (UDocument *document : docTemplate->GetDocuments()) {
-            if (!document->SaveModified()) {
-                event->ignore();
-                return;
-            }
+    for (UDocument *document : openDocuments()) {
+        if (isOpen(document) && !document->SaveModified()) {
+            event->ignore();
+            return;
         }
     }
     saveLayout();
@@ -292,16 +277,4 @@ void DeskFrame::dropEvent(QDropEvent *event)
             OpenFile(url.toLocalFile());
         }
     }
-}
-
-void DeskFrame::loadLayout()
-{
-    restoreGeometry(QByteArray::fromBase64(GetProfileString(QString(), geometryEntry).toLatin1()));
-    restoreState(QByteArray::fromBase64(GetProfileString(QString(), layoutEntry).toLatin1()));
-}
-
-void DeskFrame::saveLayout() const
-{
-    WriteProfileString(QString(), geometryEntry, QString::fromLatin1(saveGeometry().toBase64()));
-    WriteProfileString(QString(), layoutEntry, QString::fromLatin1(saveState().toBase64()));
 }

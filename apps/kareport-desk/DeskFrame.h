@@ -1,5 +1,8 @@
 #pragma once
 
+#include "FileWatch.h"
+#include "Recovery.h"
+#include "UDocument.h"
 #include "UXTPMDIFrameWnd.h"
 
 #include <functional>
@@ -7,7 +10,11 @@
 
 class QMenu;
 class QToolBar;
-class UDocument;
+
+namespace kareport
+{
+struct TemplateJob;
+}
 
 /// The main window of the desktop program.
 class DeskFrame : public UXTPMDIFrameWnd
@@ -18,11 +25,22 @@ public:
 
     const std::vector<kareport::Command> &commands() const override { return commands_; }
 
-    /// Opens a job, a saved report or rich text. @return false, after a message, when it cannot be opened
+    /// Opens a job, a saved report, rich text, or a template to make a report from.
+    /// @return false, after a message, when it cannot be opened; also when the user has stopped it
     bool OpenFile(const QString &path);
+    /// Makes a report from a template and a data file. @return as `OpenFile`
+    bool OpenTemplateJob(const kareport::TemplateJob &job);
+
+    /// Offers what a program that crashed had open.
+    void OfferLeftReports();
+
+    /// Told by the application what becomes of documents: their files are watched.
+    void NoteDocumentEvent(UDocument &document, UDocument::DocumentEvent event);
 
     /// Asks for a file to open; a test answers instead.
     std::function<std::optional<QString>()> askFile;
+    /// Asks for template and data, beginning with a template file that may be empty; a test answers instead.
+    std::function<std::optional<kareport::TemplateJob>(const QString &templateFile)> askTemplate;
 
 protected:
     void closeEvent(QCloseEvent *event) override;
@@ -33,18 +51,29 @@ private:
     std::vector<kareport::Command> makeCommands();
     void makeMenus();
     void fillRecentFiles();
+
+    UDocument *activeDocument() const;
     void newReport();
-    void activate(UDocument *report);
     void open();
+    void fromTemplate(const QString &templateFile);
+    void askPreferences();
+    bool finishOpening(UDocument *report, const QString &error);
+    void activate(UDocument *report);
+    void fileChanged(const QString &path);
+    void reload(UDocument &document);
+
     void newWindow();
     void arrange(Qt::Orientation orientation);
     void cascade();
+    /// Docks all panes one after the other. @param join  joins a pane to the one before it
+    void dockAll(const std::function<void(QDockWidget *before, QDockWidget *dock)> &join);
     void about();
-    UDocument *activeDocument() const;
     void loadLayout();
     void saveLayout() const;
 
     std::vector<kareport::Command> commands_;
     QMenu *recentFiles_ = nullptr;
     QToolBar *toolBar_ = nullptr;
+    kareport::FileWatch files_;
+    kareport::Recovery recovery_;
 };

@@ -1,5 +1,6 @@
 #include "JobLauncher.h"
 
+#include "DeskPreferences.h"
 #include "Interrupt.h"
 #include "JobReader.h"
 #include "JobRunner.h"
@@ -43,15 +44,14 @@ private:
     QProgressDialog dialog_;
 };
 
-UReportDoc *runJob(const QString &path, QWidget *parent, QString &error)
+UReportDoc *runJob(Expected<JsonSource> read, QWidget *parent, QString &error)
 {
-    auto read = JsonSource::read(path);
     if (const InputError *wrong = errorOf(read)) {
         error = wrong->message();
         return nullptr;
     }
     auto &source = std::get<JsonSource>(read);
-    const Job job = readJob(source);
+    const Job job = readJob(source, std::nullopt, loadPreferences().jobDefaults());
     if (source.error()) {
         error = source.error()->message();
         return nullptr;
@@ -78,17 +78,28 @@ UReportDoc *runJob(const QString &path, QWidget *parent, QString &error)
     return report;
 }
 
+template <typename Read>
+UReportDoc *launch(const Read &read, QWidget *parent, QString &error)
+{
+    setInterrupted(false);
+    try {
+        return runJob(read(), parent, error);
+    } catch (const std::bad_alloc &) {
+        error = Xlate("There is not enough memory for this input.");
+        return nullptr;
+    }
+}
+
 } // namespace
 
 UReportDoc *launchJob(const QString &path, QWidget *parent, QString &error)
 {
-    setInterrupted(false);
-    try {
-        return runJob(path, parent, error);
-    } catch (const std::bad_alloc &) {
-        error = Xlate("there is not enough memory for this input");
-        return nullptr;
-    }
+    return launch([&path] { return JsonSource::read(path); }, parent, error);
+}
+
+UReportDoc *launchTemplateJob(const TemplateJob &job, QWidget *parent, QString &error)
+{
+    return launch([&job] { return Expected<JsonSource>(JsonSource::fromObject(job.toJson())); }, parent, error);
 }
 
 } // namespace kareport

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "TemplateJob.h"
+
 #include <QString>
 
 class QWidget;
@@ -12,5 +14,7 @@ namespace kareport
 /// @param error  receives what went wrong; empty when the job was stopped
 /// @return the report, shown in its pane; null when it was not made
 UReportDoc *launchJob(const QString &path, QWidget *parent, QString &error);
+/// The same with a data file and a template.
+UReportDoc *launchTemplateJob(const TemplateJob &job, QWidget *parent, QString &error);
 
 } // namespace kareport

@@ -23,6 +23,7 @@ int main(int argc, char **argv)
     DeskFrame frame;
     kareport::installDialogs(&frame);
     frame.show();
+    frame.OfferLeftReports();
     for (const QString &file : parser.positionalArguments()) {
         frame.OpenFile(file);
     }

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "TemplateJob.h"
+
 #include <QString>
 #include <QStringList>
 
@@ -21,12 +23,8 @@ enum ExitStatus
 /// `kareport render`
 struct RenderCommand
 {
-    QString job; ///< empty for the short form
-    QString templateFile;
-    QString templateName;
-    QString table;
-    QString block;
-    QString data;
+    QString job;             ///< empty for the short form
+    TemplateJob templateJob; ///< the short form
     QStringList outputs;
     QString as;
     QStringList sets;
@@ -69,6 +67,15 @@ struct CheckCommand
     QString file;
 
     ExitStatus run() const;
+};
+
+/// `kareport view`
+struct ViewCommand
+{
+    QString file;
+
+    /// Starts the desktop program and leaves it to itself.
+    ExitStatus run(int &argc, char **argv) const;
 };
 
 /// Writes a line to standard output or standard error.

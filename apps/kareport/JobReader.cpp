@@ -25,9 +25,8 @@ constexpr struct
 } papers[] = {
     {u"A4", PaperSize::A4}, {u"A3", PaperSize::A3}, {u"Letter", PaperSize::Letter}, {u"Legal", PaperSize::Legal}};
 
-Job::Page readPage(const JsonNode &node)
+Job::Page readPage(const JsonNode &node, Job::Page page)
 {
-    Job::Page page;
     if (!node.expectObject()) {
         return page;
     }
@@ -266,7 +265,7 @@ std::optional<Output> readOutput(const JsonNode &node, const QDir &folder, std::
 
 } // namespace
 
-Job readJob(JsonSource &source, std::optional<OutputKind> kindOtherwise)
+Job readJob(JsonSource &source, std::optional<OutputKind> kindOtherwise, const JobDefaults &defaults)
 {
     const JsonNode root(source);
     const QDir folder = source.path().isEmpty() ? QDir::current() : QFileInfo(source.path()).absoluteDir();
@@ -294,8 +293,8 @@ Job readJob(JsonSource &source, std::optional<OutputKind> kindOtherwise)
             now.fail(Xlate("a date and time such as 2024-03-05T14:07:00 was expected"));
         }
     }
-    job.page = readPage(root["page"]);
-    job.settings = readSettings(root["settings"]);
+    job.page = readPage(root["page"], defaults.page);
+    job.settings = readSettings(root["settings"], defaults.settings);
     if (const JsonNode node = root["template"]; node.expectObject()) {
         node.allowOnly({"file", "name"});
         for (const char *key : {"file", "name"}) {

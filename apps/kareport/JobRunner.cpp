@@ -201,7 +201,7 @@ JobRunner::JobRunner(const Job &job, JsonSource &source, Progress &progress)
     // In a program with windows the report belongs to it.
     if (UApplication::Get() == nullptr) {
         application_.emplace();
-        application_->AddDocTemplate(ReportInitialTemplate());
+        application_->AddDocTemplate(makeReportTemplate());
     }
 }
 
@@ -219,9 +219,12 @@ std::optional<InputError> JobRunner::prepare()
 {
     // No page is measured before the face is known.
     setDefaultPrinter({PrinterSource::None});
-    report_ = CreateReport(job_.title.value_or(QString()), job_.header, false, nullptr, 0, nullptr);
+    report_ = CreateReport(QString(), job_.header, false, nullptr, 0, nullptr);
     if (report_ == nullptr) {
         return InputError{source_.path(), std::nullopt, Xlate("the report could not be made")};
+    }
+    if (job_.title) {
+        report_->SetReportFileName(*job_.title);
     }
     report_->SetRTFDataFlag(std::any_of(job_.outputs.begin(), job_.outputs.end(),
                                         [](const Output &output) { return output.kind == OutputKind::RichTextImage; }));
@@ -245,10 +248,13 @@ std::optional<InputError> JobRunner::prepare()
         return error;
     }
     applyOptions();
+    // A title is set once, when the page is known: its header line is built then, and set twice it would be numbered as
+    // if another report had it.
     if (job_.title) {
         report_->SetTitle(*job_.title);
+    } else if (!job_.reportTemplate) {
+        report_->SetHeader();
     }
-    report_->SetHeader();
     return std::nullopt;
 }
 

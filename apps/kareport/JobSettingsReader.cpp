@@ -1,5 +1,6 @@
 #include "JobReader.h"
 
+#include "JobSettingsWords.h"
 #include "Xlate.h"
 
 #include <array>
@@ -41,13 +42,6 @@ auto placeIn(const std::array<QStringView, count> &words)
     };
 }
 
-// The words stand in the order of the values that they mean.
-constexpr std::array<QStringView, 3> stationFormats = {u"plain", u"0+00", u"0+000"};
-constexpr std::array<QStringView, 2> northEastOrders = {u"EN", u"NE"};
-constexpr std::array<QStringView, 3> bearingUnits = {u"dms", u"deg", u"gon"};
-constexpr std::array<QStringView, 2> bearingStyles = {u"circle", u"quadrant"};
-constexpr std::array<QStringView, 2> bearingReferences = {u"north", u"south"};
-
 constexpr const char *lengthKeys = "m, mm, km, ft, usft";
 constexpr const char *areaKeys = "m2, ha, km2, ft2, ac";
 
@@ -72,9 +66,8 @@ void readAngleMarks(const JsonNode &node, std::array<char, 3> &marks)
 
 } // namespace
 
-UJobSettings readSettings(const JsonNode &node)
+UJobSettings readSettings(const JsonNode &node, UJobSettings settings)
 {
-    UJobSettings settings;
     if (!node.expectObject()) {
         return settings;
     }

@@ -35,7 +35,7 @@ JobSurroundings::JobSurroundings(const Job &job)
     if (job.page.fontSize) {
         SetReportFontSize(static_cast<unsigned>(*job.page.fontSize));
     }
-    SetReportPrinterToPortrait(job.page.portrait);
+    SetReportPrinterSetToPortrait(job.page.portrait);
     setStartPathName(job.folder);
     SetApplicationTitle(job.application);
     fixTime(job.now ? job.now : buildTime());

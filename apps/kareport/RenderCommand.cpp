@@ -7,33 +7,12 @@
 #include "OutputsWriter.h"
 #include "Xlate.h"
 
-#include <QJsonArray>
-#include <QJsonObject>
-
 namespace kareport
 {
 
-namespace
-{
-
-/// The job that the short form of the command line stands for.
-QJsonObject shortJob(const RenderCommand &command)
-{
-    const QString set = QStringLiteral("data");
-    const bool isTable = !command.table.isEmpty();
-    const QJsonObject step = {
-        {isTable ? QStringLiteral("table") : QStringLiteral("block"), isTable ? command.table : command.block},
-        {set, set}};
-    return {{QStringLiteral("template"), QJsonObject{{QStringLiteral("file"), command.templateFile},
-                                                     {QStringLiteral("name"), command.templateName}}},
-            {set, QJsonObject{{set, QJsonObject{{QStringLiteral("csv"), command.data}}}}},
-            {QStringLiteral("report"), QJsonArray{step}}};
-}
-
-} // namespace
-
 std::optional<QString> RenderCommand::usageError() const
 {
+    const auto &[templateFile, templateName, table, block, data] = templateJob;
     const bool isShort =
         !templateFile.isEmpty() || !templateName.isEmpty() || !table.isEmpty() || !block.isEmpty() || !data.isEmpty();
     if (job.isEmpty() != isShort) {
@@ -57,7 +36,8 @@ std::optional<QString> RenderCommand::usageError() const
 
 ExitStatus RenderCommand::run(int &argc, char **argv) const
 {
-    auto read = job.isEmpty() ? Expected<JsonSource>(JsonSource::fromObject(shortJob(*this))) : JsonSource::read(job);
+    auto read =
+        job.isEmpty() ? Expected<JsonSource>(JsonSource::fromObject(templateJob.toJson())) : JsonSource::read(job);
     if (const InputError *error = errorOf(read)) {
         printError(error->message());
         return exitInput;

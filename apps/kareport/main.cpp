@@ -49,8 +49,10 @@ struct RenderOptions
 
     kareport::RenderCommand command() const
     {
-        return {text(job),      text(templateFile), text(templateName), text(table), text(block), text(data),
-                texts(outputs), text(as),           texts(sets),        progress,    quiet};
+        return {text(job),      {text(templateFile), text(templateName), text(table), text(block), text(data)},
+                texts(outputs), text(as),
+                texts(sets),    progress,
+                quiet};
     }
 };
 
@@ -174,6 +176,10 @@ int runProgram(int argc, char **argv)
     checkCommand->footer("Each remark is one line, file:line:column: warning|error: text.\n"
                          "Exit status: 0 without errors, 2 with.");
 
+    std::string viewFile;
+    CLI::App *viewCommand = program.add_subcommand("view", "Open a report, a job or a template in a window");
+    viewCommand->add_option("FILE", viewFile, "Report (.rep, .rtf), job (.json) or template (.xml)")->required();
+
     try {
         program.parse(argc, argv);
     } catch (const CLI::ParseError &error) {
@@ -185,6 +191,9 @@ int runProgram(int argc, char **argv)
     }
     if (convertCommand->parsed()) {
         return runReportCommand(convert.command(), "convert", argc, argv);
+    }
+    if (viewCommand->parsed()) {
+        return kareport::ViewCommand{text(viewFile)}.run(argc, argv);
     }
     if (templatesCommand->parsed()) {
         return kareport::TemplatesCommand{text(templatesFile), text(templatesName), templatesJson}.run();

@@ -10,7 +10,8 @@
 enum class MessageButtons
 {
     Ok,
-    YesNoCancel
+    YesNoCancel,
+    YesNo
 };
 enum class MessageAnswer
 {

@@ -45,6 +45,11 @@ QString GetTempDir(bool /*reserved*/)
     return QDir::tempPath();
 }
 
+int IsFileExisting(const QString &path)
+{
+    return QFileInfo(path).isFile() ? 1 : 0;
+}
+
 QString GetInitialOpenDir(const QString &key)
 {
     const QString folder = GetProfileString(QString(), key);

@@ -10,6 +10,8 @@ KAREPORT_EXPORT QString GetLibraryDir(bool reserved);
 KAREPORT_EXPORT QString GetStartPathName();
 /// The system's folder for temporary files. @param reserved  false
 KAREPORT_EXPORT QString GetTempDir(bool reserved);
+/// Non-zero when there is a file of that name; 0 for a folder and for an empty name.
+KAREPORT_EXPORT int IsFileExisting(const QString &path);
 /// The folder last used for a purpose, kept in the profile under a key; empty when there is none or it is gone.
 KAREPORT_EXPORT QString GetInitialOpenDir(const QString &key);
 /// Keeps the folder of a file as the one last used for a purpose.

@@ -28,7 +28,7 @@ bool IsReportPrinterSetToPortrait()
     return GetProfileString(QString(), portraitEntry, QStringLiteral("1")) != u"0";
 }
 
-void SetReportPrinterToPortrait(bool portrait)
+void SetReportPrinterSetToPortrait(bool portrait)
 {
     WriteProfileString(QString(), portraitEntry, portrait ? QStringLiteral("1") : QStringLiteral("0"));
 }

@@ -10,7 +10,7 @@ KAREPORT_EXPORT void SetReportFontSize(unsigned points);
 
 /// Whether reports are printed upright; true when the user has not chosen.
 KAREPORT_EXPORT bool IsReportPrinterSetToPortrait();
-KAREPORT_EXPORT void SetReportPrinterToPortrait(bool portrait);
+KAREPORT_EXPORT void SetReportPrinterSetToPortrait(bool portrait);
 
 /// Non-zero when the user wants reports in the preferred editor instead of the report view.
 KAREPORT_EXPORT int GetUsePreferredReportEditorFlag();

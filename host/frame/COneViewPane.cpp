@@ -3,6 +3,7 @@
 #include "UView.h"
 #include "UXTPMDIFrameWnd.h"
 
+#include <QAction>
 #include <QCloseEvent>
 #include <QDockWidget>
 
@@ -23,7 +24,11 @@ protected:
         }
         // The pane, when it closes, takes this widget away later: it must outlive the event.
         event->ignore();
+        const QPointer<Dock> self(this);
         pane_->OnSysCommand(scClose, 0);
+        if (self && self->pane_ != nullptr) {
+            toggleViewAction()->setChecked(true); // the pane has not closed
+        }
     }
 
 private:
@@ -33,6 +38,7 @@ private:
 COneViewPane::COneViewPane() : dock_(new Dock(this))
 {
     dock_->setAttribute(Qt::WA_DeleteOnClose, false);
+    dock_->setObjectName(QStringLiteral("pane")); // a frame that saves its layout asks for one
 }
 
 COneViewPane::~COneViewPane()
@@ -72,7 +78,8 @@ void COneViewPane::SetPlace(CViewPane *parent, unsigned style, const QRect *rect
 void COneViewPane::UpdateTitle()
 {
     if (dock_) {
-        dock_->setWindowTitle(GetCaption());
+        // On tabs and title bars an ampersand marks a key.
+        dock_->setWindowTitle(GetCaption().replace(u'&', QStringLiteral("&&")));
         dock_->setAccessibleName(GetCaption());
     }
 }

@@ -10,9 +10,9 @@ public:
     CPropertyPane();
     ~CPropertyPane() override;
 
-    /// Called when a document has changed.
+    /// Called when a document has changed; with null for one that has closed since.
     virtual void OnUpdateProperties(UDocument *document);
 
-    /// Tells all open property panes that a document has changed.
+    /// Tells all open property panes that a document has changed. @param document  null when it has closed since
     static void UpdateAllPropertyPane(UDocument *document);
 };

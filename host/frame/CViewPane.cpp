@@ -51,7 +51,7 @@ void CViewPane::AddView(std::unique_ptr<UView> view)
 
 UDocument *CViewPane::GetActiveDocument() const
 {
-    return views_.empty() ? nullptr : views_.front()->GetDocument();
+    return views_.empty() ? nullptr : views_.back()->GetDocument();
 }
 
 void CViewPane::SetWindowTextW(const QString &text)
@@ -88,6 +88,14 @@ void CViewPane::ClosePane()
     }
     views_.clear();
     delete this;
+}
+
+void CViewPane::GetPaneTitles(QStringList &titles)
+{
+    titles.clear();
+    for (const CViewPane *pane : openPanes()) {
+        titles.append(pane->GetWindowTextW());
+    }
 }
 
 void CViewPane::GetPaneCaptions(QStringList &captions)

@@ -31,7 +31,7 @@ public:
     virtual void SetPlace(CViewPane *parent, unsigned style, const QRect *rect);
     unsigned GetStyle() const { return style_; }
     const std::optional<QRect> &GetRect() const { return rect_; }
-    /// The document of the pane's first view, or null.
+    /// The document of the view that was put into the pane last, which it shows; null for a pane without one.
     UDocument *GetActiveDocument() const;
 
     /// The pane's title without its number.
@@ -61,6 +61,8 @@ public:
     static bool IsOpen(const CViewPane *pane);
     /// The captions of all open panes, in the order in which they were opened.
     static void GetPaneCaptions(QStringList &captions);
+    /// The same without the numbers that panes of one document have.
+    static void GetPaneTitles(QStringList &titles);
 
 private:
     std::vector<std::unique_ptr<UView>> views_;

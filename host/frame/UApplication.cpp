@@ -47,6 +47,8 @@ void UApplication::AddToRecentFileList(const QString &path)
     }
 }
 
+void UApplication::OnDocumentEvent(UDocument & /*document*/, UDocument::DocumentEvent /*event*/) {}
+
 void UApplication::ForgetReport(const UDocument *report)
 {
     if (currentReport_ == report) {

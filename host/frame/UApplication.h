@@ -2,6 +2,7 @@
 
 #include "KaReportExport.h"
 #include "UDocTemplate.h"
+#include "UDocument.h"
 
 #include <QStringList>
 
@@ -28,6 +29,9 @@ public:
     /// Puts a file to the front of the list of files last used.
     virtual void AddToRecentFileList(const QString &path);
     const QStringList &GetRecentFileList() const { return recentFiles_; }
+
+    /// Called after a document has been made, opened, saved or closed.
+    virtual void OnDocumentEvent(UDocument &document, UDocument::DocumentEvent event);
 
     /// The report that the user works with, and the view that goes with it; null without one.
     UDocument *GetCurrentReport() const { return currentReport_; }

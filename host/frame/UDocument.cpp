@@ -70,7 +70,11 @@ void UDocument::UpdateAllViews(UView *sender, long hint, void *hintObject)
 {
     // A view may close itself or another one while it is updated.
     const std::vector<UView *> views = views_;
+    const std::weak_ptr<const bool> life = life_;
     for (UView *view : views) {
+        if (life.expired()) {
+            return; // the last view has closed the document
+        }
         if (view != sender && std::find(views_.begin(), views_.end(), view) != views_.end()) {
             view->OnUpdate(sender, hint, hintObject);
         }
@@ -215,7 +219,12 @@ void UDocument::OnAutoDelete() {}
 
 void UDocument::DeleteContents() {}
 
-void UDocument::OnDocumentEvent(DocumentEvent /*event*/) {}
+void UDocument::OnDocumentEvent(DocumentEvent event)
+{
+    if (UApplication::Get() != nullptr) {
+        UApplication::Get()->OnDocumentEvent(*this, event);
+    }
+}
 
 void UDocument::OnReportClosed(UDocument * /*report*/) {}
 

@@ -4,6 +4,7 @@
 
 #include <QString>
 
+#include <memory>
 #include <vector>
 
 class CViewPane;
@@ -73,6 +74,7 @@ public:
     virtual void DeleteContents();
     /// Called when a closed document is about to delete itself.
     virtual void OnAutoDelete();
+    /// Called after the document has been made, opened, saved or closed: tells the application.
     virtual void OnDocumentEvent(DocumentEvent event);
     /// Whether the document only serves a search of the shell's; no document of this host does.
     virtual bool IsSearchAndOrganizeHandler() const { return false; }
@@ -101,4 +103,5 @@ private:
     bool autoDelete_ = true;
     std::vector<UView *> views_;
     UDocTemplate *docTemplate_ = nullptr;
+    std::shared_ptr<const bool> life_ = std::make_shared<bool>(true); ///< ends with the document
 };

@@ -104,4 +104,19 @@ std::optional<AngleUnit> angleUnitFromKey(QStringView key)
     return unitFromKey<AngleUnit>(angles, key);
 }
 
+QStringView keyOf(LengthUnit unit)
+{
+    return rowOf(lengths, unit).key;
+}
+
+QStringView keyOf(AreaUnit unit)
+{
+    return rowOf(areas, unit).key;
+}
+
+QStringView keyOf(AngleUnit unit)
+{
+    return rowOf(angles, unit).key;
+}
+
 } // namespace kareport

@@ -48,5 +48,9 @@ KAREPORT_EXPORT QStringView symbolOf(LengthUnit unit);
 KAREPORT_EXPORT std::optional<LengthUnit> lengthUnitFromKey(QStringView key);
 KAREPORT_EXPORT std::optional<AreaUnit> areaUnitFromKey(QStringView key);
 KAREPORT_EXPORT std::optional<AngleUnit> angleUnitFromKey(QStringView key);
+/// The settings key of a unit.
+KAREPORT_EXPORT QStringView keyOf(LengthUnit unit);
+KAREPORT_EXPORT QStringView keyOf(AreaUnit unit);
+KAREPORT_EXPORT QStringView keyOf(AngleUnit unit);
 
 } // namespace kareport

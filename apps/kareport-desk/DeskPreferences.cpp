@@ -1,0 +1,70 @@
+#include "DeskPreferences.h"
+
+#include "JobSettingsWriter.h"
+#include "Preferences.h"
+#include "Profile.h"
+#include "ReportMargins.h"
+
+#include <QJsonDocument>
+
+namespace kareport
+{
+
+namespace
+{
+
+const QString settingsEntry = QStringLiteral("Job Settings");
+const QString marginsEntry = QStringLiteral("Report Margins");
+const QString languageEntry = QStringLiteral("Language");
+constexpr QMargins usualMargins(1000, 1000, 1200, 2000);
+
+UJobSettings settingsFromText(const QString &text)
+{
+    auto read = JsonSource::fromBytes(settingsEntry, text.toUtf8());
+    auto *source = std::get_if<JsonSource>(&read);
+    if (source == nullptr) {
+        return {};
+    }
+    const UJobSettings settings = readSettings(JsonNode(*source));
+    return source->failed() ? UJobSettings() : settings;
+}
+
+} // namespace
+
+JobDefaults DeskPreferences::jobDefaults() const
+{
+    JobDefaults defaults;
+    defaults.settings = settings;
+    defaults.page.portrait = portrait;
+    defaults.page.margins = margins;
+    defaults.page.fontSize = static_cast<int>(fontSize);
+    return defaults;
+}
+
+DeskPreferences loadPreferences()
+{
+    DeskPreferences preferences;
+    preferences.settings = settingsFromText(GetProfileString(QString(), settingsEntry));
+    preferences.fontSize = GetReportFontSize();
+    preferences.margins = marginsFromText(GetProfileString(QString(), marginsEntry), usualMargins);
+    preferences.portrait = IsReportPrinterSetToPortrait();
+    preferences.usesEditor = GetUsePreferredReportEditorFlag() != 0;
+    preferences.editor = GetProfileString(QString(), GetPreferredReportEditorRegKey());
+    preferences.language = GetProfileString(QString(), languageEntry);
+    return preferences;
+}
+
+void savePreferences(const DeskPreferences &preferences)
+{
+    WriteProfileString(
+        QString(), settingsEntry,
+        QString::fromUtf8(QJsonDocument(settingsToJson(preferences.settings)).toJson(QJsonDocument::Compact)));
+    SetReportFontSize(preferences.fontSize);
+    WriteProfileString(QString(), marginsEntry, marginsToText(preferences.margins));
+    SetReportPrinterSetToPortrait(preferences.portrait);
+    SetUsePreferredReportEditorFlag(preferences.usesEditor);
+    WriteProfileString(QString(), GetPreferredReportEditorRegKey(), preferences.editor);
+    WriteProfileString(QString(), languageEntry, preferences.language);
+}
+
+} // namespace kareport

@@ -1,0 +1,111 @@
+#include "PreferencesDialog.h"
+
+#include "EditorPage.h"
+#include "PageSetupForm.h"
+#include "ReportPrinter.h"
+#include "UnitsPage.h"
+#include "Xlate.h"
+
+#include <QComboBox>
+#include <QDialogButtonBox>
+#include <QFormLayout>
+#include <QSpinBox>
+#include <QTabWidget>
+#include <QVBoxLayout>
+
+namespace kareport
+{
+
+namespace
+{
+
+constexpr int leastFontSize = 4;
+constexpr int mostFontSize = 72;
+
+PageSetupForm *makePageForm(const DeskPreferences &preferences)
+{
+    PageSetup setup;
+    fillPrinters(setup);
+    setup.printers.clear(); // a printer is chosen when a report is printed
+    setup.margins = preferences.margins;
+    setup.portrait = preferences.portrait;
+    return new PageSetupForm(setup);
+}
+
+} // namespace
+
+PreferencesDialog::PreferencesDialog(const DeskPreferences &preferences, QWidget *parent)
+    : QDialog(parent),
+      tabs_(new QTabWidget),
+      units_(new UnitsPage(preferences.settings)),
+      fontSize_(new QSpinBox),
+      page_(makePageForm(preferences)),
+      editor_(new EditorPage(preferences.usesEditor, preferences.editor)),
+      language_(new QComboBox)
+{
+    setWindowTitle(Xlate("Preferences"));
+    setWindowFlag(Qt::WindowContextHelpButtonHint, false);
+
+    fontSize_->setRange(leastFontSize, mostFontSize);
+    fontSize_->setSuffix(Xlate(" pt"));
+    fontSize_->setValue(static_cast<int>(preferences.fontSize));
+    fontSize_->setAccessibleName(Xlate("Font size"));
+    auto *page = new QWidget;
+    auto *pageLayout = new QVBoxLayout(page);
+    auto *fontRow = new QFormLayout;
+    fontRow->addRow(Xlate("&Font size of new reports:"), fontSize_);
+    pageLayout->addLayout(fontRow);
+    pageLayout->addWidget(page_);
+    pageLayout->addStretch();
+
+    language_->addItem(Xlate("As the system"), QString());
+    language_->addItem(QStringLiteral("English"), QStringLiteral("en"));
+    language_->addItem(QStringLiteral("Deutsch"), QStringLiteral("de"));
+    language_->addItem(QStringLiteral("日本語"), QStringLiteral("ja"));
+    language_->setCurrentIndex(qMax(0, language_->findData(preferences.language)));
+    language_->setAccessibleName(Xlate("Language"));
+    auto *program = new QWidget;
+    auto *programLayout = new QFormLayout(program);
+    programLayout->addRow(Xlate("&Language (from the next start):"), language_);
+
+    tabs_->addTab(units_, Xlate("&Units and Formats"));
+    tabs_->addTab(page, Xlate("&Page"));
+    tabs_->addTab(editor_, Xlate("&Editor"));
+    tabs_->addTab(program, Xlate("P&rogram"));
+
+    auto *layout = new QVBoxLayout(this);
+    layout->addWidget(tabs_);
+    auto *buttons = new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel);
+    connect(buttons, &QDialogButtonBox::accepted, this, &PreferencesDialog::accept);
+    connect(buttons, &QDialogButtonBox::rejected, this, &PreferencesDialog::reject);
+    layout->addWidget(buttons);
+}
+
+DeskPreferences PreferencesDialog::preferences() const
+{
+    DeskPreferences preferences;
+    preferences.settings = units_->settings();
+    preferences.fontSize = static_cast<unsigned>(fontSize_->value());
+    const PageSetup page = page_->setup();
+    preferences.margins = page.margins;
+    preferences.portrait = page.portrait;
+    preferences.usesEditor = editor_->usesEditor();
+    preferences.editor = editor_->editor();
+    preferences.language = language_->currentData().toString();
+    return preferences;
+}
+
+void PreferencesDialog::accept()
+{
+    constexpr int pageTab = 1;
+    constexpr int editorTab = 2;
+    if (!page_->confirm()) {
+        tabs_->setCurrentIndex(pageTab);
+    } else if (!editor_->confirm()) {
+        tabs_->setCurrentIndex(editorTab);
+    } else {
+        QDialog::accept();
+    }
+}
+
+} // namespace kareport

@@ -1,0 +1,36 @@
+#pragma once
+
+#include "DeskPreferences.h"
+
+#include <QDialog>
+
+class QComboBox;
+class QSpinBox;
+class QTabWidget;
+
+namespace kareport
+{
+
+class EditorPage;
+class PageSetupForm;
+class UnitsPage;
+
+/// Asks for what holds for all reports.
+class PreferencesDialog : public QDialog
+{
+public:
+    explicit PreferencesDialog(const DeskPreferences &preferences, QWidget *parent = nullptr);
+
+    DeskPreferences preferences() const;
+    void accept() override;
+
+private:
+    QTabWidget *tabs_;
+    UnitsPage *units_;
+    QSpinBox *fontSize_;
+    PageSetupForm *page_;
+    EditorPage *editor_;
+    QComboBox *language_;
+};
+
+} // namespace kareport

@@ -1,0 +1,72 @@
+#pragma once
+
+#include <QHash>
+#include <QLockFile>
+#include <QSet>
+#include <QString>
+
+#include <memory>
+#include <vector>
+
+class UReportDoc;
+
+namespace kareport
+{
+
+/// An open report as it is kept on the disk.
+struct KeptReport
+{
+    QString title;
+    QString path;     ///< of its file; empty for a report that has none
+    QString textFile; ///< holds what was not saved; empty when the report's own file holds all
+};
+
+/// Keeps what is open on the disk, so that it comes back after a crash.
+///
+/// Every running program has a folder of its own, which goes with a regular end. A folder whose program no longer runs was
+/// left by a crash.
+class Recovery
+{
+public:
+    /// @param folder  where the folders of all running programs are
+    explicit Recovery(const QString &folder = usualFolder());
+    /// The regular end: nothing is kept.
+    ~Recovery();
+    Recovery(const Recovery &) = delete;
+    Recovery &operator=(const Recovery &) = delete;
+
+    static QString usualFolder();
+
+    /// What programs that crashed had open, the reports that were opened first coming first.
+    std::vector<KeptReport> leftReports() const;
+    /// Opens one of them again, with what was not saved. @return null when it cannot be opened
+    static UReportDoc *reopen(const KeptReport &kept);
+    /// Throws away what crashed programs left.
+    void discardLeft();
+
+    /// Writes down what is open now. Texts that have not changed since are not written again.
+    void keep();
+    /// A report has been closed: what comes in its place in memory is another one.
+    void forget(const UReportDoc *report) { closed_.insert(report); }
+
+private:
+    struct Written
+    {
+        QString file;
+        quint64 edits = 0;
+        qint64 length = -1;
+    };
+
+    QString textFileOf(const UReportDoc &report);
+
+    QString folder_; ///< of this program; empty when it cannot be made
+    std::unique_ptr<QLockFile> lock_;
+    std::vector<std::pair<QString, std::unique_ptr<QLockFile>>> left_; ///< folders of crashed programs
+    QHash<const UReportDoc *, Written> written_;
+    QSet<const UReportDoc *> closed_; ///< since `keep` was called last
+    QStringList gone_;                ///< texts that are no longer needed
+    QByteArray list_;                 ///< as it was written last
+    int lastNumber_ = 0;
+};
+
+} // namespace kareport

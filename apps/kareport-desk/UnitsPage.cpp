@@ -1,0 +1,210 @@
+#include "UnitsPage.h"
+
+#include "UFormatAngle.h"
+#include "UFormatBearing.h"
+#include "Xlate.h"
+
+#include <QCheckBox>
+#include <QComboBox>
+#include <QFontDatabase>
+#include <QFormLayout>
+#include <QGroupBox>
+#include <QHBoxLayout>
+#include <QLabel>
+#include <QLineEdit>
+#include <QRegularExpressionValidator>
+#include <QSpinBox>
+
+#include <numbers>
+
+namespace kareport
+{
+
+namespace
+{
+
+constexpr int mostDecimals = 15;
+constexpr int mostBearingDecimals = 9;
+
+// Values whose digits show what decimals, zeros and units do to them.
+constexpr double sampleLength = 1234.56789;                                                 // metres
+constexpr double sampleStation = 12345.678;                                                 // metres
+constexpr double sampleArea = 25600.5;                                                      // square metres
+constexpr double sampleAngle = (7 + 5 / 60.0) * std::numbers::pi / 180;                     // 7°05'
+constexpr double sampleBearing = (135 + 4 / 60.0 + 9.25 / 3600.0) * std::numbers::pi / 180; // 135°04'09.25"
+
+/// A list of choices in the order of the values that they mean.
+QComboBox *choice(const QStringList &items, int current)
+{
+    auto *box = new QComboBox;
+    box->addItems(items);
+    box->setCurrentIndex(current);
+    return box;
+}
+
+QSpinBox *decimals(int value, int most)
+{
+    auto *box = new QSpinBox;
+    box->setRange(0, most);
+    box->setValue(value);
+    return box;
+}
+
+/// A row of two fields under one label; the second has its name from its accessible name.
+void addPair(QFormLayout &form, const QString &label, QWidget *first, const QString &secondName, QWidget *second)
+{
+    auto *row = new QHBoxLayout;
+    row->addWidget(first, 1);
+    auto *secondLabel = new QLabel(secondName);
+    secondLabel->setBuddy(second);
+    row->addWidget(secondLabel);
+    row->addWidget(second);
+    auto *firstLabel = new QLabel(label);
+    firstLabel->setBuddy(first);
+    form.addRow(firstLabel, row);
+}
+
+} // namespace
+
+UnitsPage::UnitsPage(const UJobSettings &settings, QWidget *parent)
+    : QWidget(parent),
+      lengthUnit_(choice({Xlate("Metre"), Xlate("Millimetre"), Xlate("Kilometre"), Xlate("International foot"),
+                          Xlate("US survey foot")},
+                         static_cast<int>(settings.lengthUnit))),
+      lengthDecimals_(decimals(settings.lengthDecimals, mostDecimals)),
+      areaUnit_(choice(
+          {Xlate("Square metre"), Xlate("Hectare"), Xlate("Square kilometre"), Xlate("Square foot"), Xlate("Acre")},
+          static_cast<int>(settings.areaUnit))),
+      angleUnit_(choice({Xlate("Degree"), Xlate("Gon"), Xlate("Radian")}, static_cast<int>(settings.angleUnit))),
+      numberDecimals_(decimals(settings.numberDecimals, mostDecimals)),
+      stationFormat_(choice({QStringLiteral("12345.678"), QStringLiteral("123+45.678"), QStringLiteral("12+345.678")},
+                            static_cast<int>(settings.stationFormat))),
+      stationDecimals_(decimals(settings.stationDecimals, mostDecimals)),
+      northEastOrder_(choice({Xlate("Easting, northing"), Xlate("Northing, easting")}, settings.northEastOrder)),
+      bearingUnit_(choice({Xlate("Degrees, minutes, seconds"), Xlate("Decimal degrees"), Xlate("Gon")},
+                          static_cast<int>(settings.bearingUnit))),
+      bearingDecimals_(decimals(settings.bearingDecimals, mostBearingDecimals)),
+      bearingStyle_(choice({Xlate("Whole circle"), Xlate("Quadrant")}, settings.bearingStyle)),
+      bearingReference_(
+          choice({Xlate("From north"), Xlate("From south")}, static_cast<int>(settings.bearingReference))),
+      bearingPadding_(new QCheckBox(Xlate("Leading &zeros"))),
+      samples_(new QLabel)
+{
+    auto *layout = new QHBoxLayout(this);
+    auto *form = new QFormLayout;
+    addPair(*form, Xlate("&Lengths:"), lengthUnit_, Xlate("Decimals:"), lengthDecimals_);
+    addPair(*form, Xlate("&Areas:"), areaUnit_, Xlate("Decimals of numbers:"), numberDecimals_);
+    form->addRow(Xlate("A&ngles:"), angleUnit_);
+    addPair(*form, Xlate("&Stations:"), stationFormat_, Xlate("Decimals:"), stationDecimals_);
+    form->addRow(Xlate("&Coordinates:"), northEastOrder_);
+    addPair(*form, Xlate("&Bearings:"), bearingUnit_, Xlate("Decimals:"), bearingDecimals_);
+    addPair(*form, QString(), bearingStyle_, QString(), bearingReference_);
+    form->addRow(QString(), bearingPadding_);
+    bearingPadding_->setChecked(settings.bearingPadding != 0);
+
+    auto *marks = new QHBoxLayout;
+    const std::array<QString, 3> markNames = {Xlate("Degree mark"), Xlate("Minute mark"), Xlate("Second mark")};
+    for (std::size_t i = 0; i < angleMarks_.size(); ++i) {
+        const char mark = settings.angleMarks.at(i);
+        angleMarks_.at(i) = new QLineEdit(mark == 0 ? QString() : QString(QLatin1Char(mark)));
+        // Printable characters of one byte: the marks have no others.
+        angleMarks_.at(i)->setValidator(new QRegularExpressionValidator(
+            QRegularExpression(QStringLiteral("[\\x{20}-\\x{7E}\\x{A0}-\\x{FF}]?")), angleMarks_.at(i)));
+        angleMarks_.at(i)->setMaximumWidth(3 * fontMetrics().averageCharWidth() + 20);
+        angleMarks_.at(i)->setAccessibleName(markNames.at(i));
+        angleMarks_.at(i)->setToolTip(markNames.at(i));
+        marks->addWidget(angleMarks_.at(i));
+        connect(angleMarks_.at(i), &QLineEdit::textChanged, this, &UnitsPage::showSamples);
+    }
+    marks->addStretch();
+    auto *marksLabel = new QLabel(Xlate("Angle &marks:"));
+    marksLabel->setBuddy(angleMarks_[0]);
+    form->addRow(marksLabel, marks);
+    layout->addLayout(form, 1);
+
+    auto *sampleBox = new QGroupBox(Xlate("Looks like"));
+    auto *sampleLayout = new QHBoxLayout(sampleBox);
+    samples_->setFont(QFontDatabase::systemFont(QFontDatabase::FixedFont));
+    samples_->setTextFormat(Qt::PlainText);
+    samples_->setAlignment(Qt::AlignTop | Qt::AlignLeft);
+    sampleLayout->addWidget(samples_);
+    layout->addWidget(sampleBox);
+
+    for (QComboBox *box : findChildren<QComboBox *>()) {
+        connect(box, &QComboBox::currentIndexChanged, this, &UnitsPage::showSamples);
+    }
+    for (QSpinBox *box : findChildren<QSpinBox *>()) {
+        connect(box, &QSpinBox::valueChanged, this, &UnitsPage::showSamples);
+    }
+    connect(bearingPadding_, &QCheckBox::toggled, this, &UnitsPage::showSamples);
+    lengthUnit_->setAccessibleName(Xlate("Unit of lengths"));
+    lengthDecimals_->setAccessibleName(Xlate("Decimals of lengths"));
+    areaUnit_->setAccessibleName(Xlate("Unit of areas"));
+    numberDecimals_->setAccessibleName(Xlate("Decimals of numbers and areas"));
+    angleUnit_->setAccessibleName(Xlate("Unit of angles"));
+    stationFormat_->setAccessibleName(Xlate("Form of stations"));
+    stationDecimals_->setAccessibleName(Xlate("Decimals of stations"));
+    northEastOrder_->setAccessibleName(Xlate("Order of coordinates"));
+    bearingUnit_->setAccessibleName(Xlate("Unit of bearings"));
+    bearingDecimals_->setAccessibleName(Xlate("Decimals of bearings"));
+    bearingStyle_->setAccessibleName(Xlate("Style of bearings"));
+    bearingReference_->setAccessibleName(Xlate("Reference of bearings"));
+    showSamples();
+}
+
+UJobSettings UnitsPage::settings() const
+{
+    UJobSettings settings;
+    settings.lengthUnit = static_cast<LengthUnit>(lengthUnit_->currentIndex());
+    settings.lengthDecimals = lengthDecimals_->value();
+    settings.areaUnit = static_cast<AreaUnit>(areaUnit_->currentIndex());
+    settings.angleUnit = static_cast<AngleUnit>(angleUnit_->currentIndex());
+    settings.numberDecimals = numberDecimals_->value();
+    settings.stationFormat = static_cast<UJobSettings::StationFormat>(stationFormat_->currentIndex());
+    settings.stationDecimals = stationDecimals_->value();
+    settings.northEastOrder = static_cast<qint16>(northEastOrder_->currentIndex());
+    settings.bearingUnit = static_cast<unsigned>(bearingUnit_->currentIndex());
+    settings.bearingDecimals = bearingDecimals_->value();
+    settings.bearingStyle = static_cast<qint16>(bearingStyle_->currentIndex());
+    settings.bearingReference = static_cast<unsigned>(bearingReference_->currentIndex());
+    settings.bearingPadding = bearingPadding_->isChecked() ? 1 : 0;
+    for (std::size_t i = 0; i < angleMarks_.size(); ++i) {
+        const QString mark = angleMarks_.at(i)->text();
+        settings.angleMarks.at(i) = mark.isEmpty() ? '\0' : mark[0].toLatin1();
+    }
+    return settings;
+}
+
+void UnitsPage::showSamples()
+{
+    const UJobSettings chosen = settings();
+    QString bearing;
+    UFormatBearing(chosen.bearingUnit, chosen.bearingStyle, chosen.bearingDecimals, chosen.bearingPadding,
+                   chosen.bearingReference)
+        .ConvertToDisplayString(sampleBearing, bearing);
+    UFormatAngle::ConvertToDMSformatString(chosen.angleMarks[0], chosen.angleMarks[1], chosen.angleMarks[2], bearing);
+    const auto number = [&chosen](double value) { return QString::number(value, 'f', chosen.numberDecimals); };
+    constexpr int angleKind = 3;
+    constexpr int areaKind = 11;
+    const QStringList rows = {
+        Xlate("Length"),
+        chosen.UnitLengthToString(sampleLength, true, true, -1, -1, false),
+        Xlate("Area"),
+        number(chosen.ConvertToDisplay(sampleArea, areaKind, 0)),
+        Xlate("Angle"),
+        number(chosen.ConvertToDisplay(sampleAngle, angleKind, 0)),
+        Xlate("Station"),
+        chosen.StationToString(sampleStation, true, false, false, -1, -1, false, false, false, false, false, false),
+        Xlate("Bearing"),
+        bearing,
+        Xlate("Columns"),
+        chosen.northEastOrder == 0 ? Xlate("E, N") : Xlate("N, E")};
+    QString text;
+    for (qsizetype i = 0; i + 1 < rows.size(); i += 2) {
+        text += rows[i] + u'\n' + QStringLiteral("  ") + rows[i + 1] + u'\n';
+    }
+    samples_->setText(text.trimmed());
+    samples_->setAccessibleName(text);
+}
+
+} // namespace kareport

@@ -1,0 +1,37 @@
+#include "EditorLauncher.h"
+
+#include <QFileInfo>
+#include <QProcess>
+
+namespace kareport
+{
+
+namespace
+{
+
+EditorLauncher &editorLauncher()
+{
+    static EditorLauncher launcher;
+    return launcher;
+}
+
+} // namespace
+
+void launchEditor(const QString &program, const QString &file, const QString &folder)
+{
+    // A relative path would be looked for in the program's folder; a bare name of a program even along the search path,
+    // and one of a file that begins with "-" would be read as an option.
+    const EditorLaunch launch{QFileInfo(program).absoluteFilePath(), QFileInfo(file).absoluteFilePath(), folder};
+    if (editorLauncher()) {
+        editorLauncher()(launch);
+    } else {
+        QProcess::startDetached(launch.program, {launch.file}, launch.folder);
+    }
+}
+
+void setEditorLauncher(EditorLauncher launcher)
+{
+    editorLauncher() = std::move(launcher);
+}
+
+} // namespace kareport

@@ -1,0 +1,368 @@
+#include "DeskFixture.h"
+
+#include "CommandLine.h"
+#include "DeskCommandIds.h"
+#include "DeskPreferences.h"
+#include "ReportEdit.h"
+#include "UApplication.h"
+#include "UReportView.h"
+#include "UView.h"
+
+#include <QAction>
+#include <QDockWidget>
+#include <QDropEvent>
+#include <QMenu>
+#include <QMenuBar>
+#include <QMimeData>
+#include <QToolBar>
+
+#include <gtest/gtest.h>
+
+namespace
+{
+
+using namespace kareport;
+
+/// All entries of the menus and their menus, with their keys.
+void collect(const QMenu &menu, QStringList &entries)
+{
+    for (const QAction *action : menu.actions()) {
+        if (action->menu() != nullptr) {
+            collect(*action->menu(), entries);
+        }
+        if (!action->isSeparator()) {
+            entries.append(action->text());
+        }
+    }
+}
+
+TEST(DeskFrame, OpensWhatItIsGiven)
+{
+    struct Row
+    {
+        const char *name;
+        QByteArray content;
+        const char *text; ///< null where it cannot be opened
+        const char *message;
+        const char *reason;
+    };
+    const Row rows[] = {
+        {"a.json", lineJob(), "First line\n", "", "a job is run"},
+        {"a.rep", "\xEF\xBB\xBFTALVEN - N\r\r\nx\r\r\n", "TALVEN - N\n\nx\n\n", "", "a saved report is loaded"},
+        {"A.REP", "TALVEN - N\r\r\n", "TALVEN - N\n\n", "", "case of the ending does not matter"},
+        {"b.rtf", "{\\rtf1 x}", "{\\rtf1 x}\n", "", "rich text keeps its source in the document"},
+        {"empty.rep", "", "", "", "an empty file is an empty report"},
+        {"bad.json", "{\"report\": [{\"lin\": 1}]}", nullptr, "bad.json:1:", "a job with a mistake says where"},
+        {"no.json", "[1", nullptr, "no.json", "a text that is no JSON"},
+        {"bad2.json", R"({"report": [{"table": "T", "data": "d"}], "data": {"d": {"csv": "gone.csv"}},
+                          "template": {"file": "gone.xml", "name": "N"}})",
+         nullptr, "gone.xml", "a missing template is named"},
+    };
+    for (const Row &row : rows) {
+        Desk desk;
+        const JobFolder folder;
+        folder.put(row.name, row.content);
+        EXPECT_EQ(desk.frame->OpenFile(folder.path(row.name)), row.text != nullptr) << row.reason;
+        if (row.text == nullptr) {
+            ASSERT_EQ(desk.messages.size(), 1) << row.reason;
+            EXPECT_TRUE(desk.messages.front().contains(QString::fromUtf8(row.message)))
+                << row.reason << ": " << desk.messages.front().toStdString();
+            EXPECT_TRUE(Desk::reports().empty()) << row.reason << ": nothing half made stays";
+            continue;
+        }
+        EXPECT_TRUE(desk.messages.isEmpty()) << row.reason;
+        ASSERT_EQ(Desk::reports().size(), 1U) << row.reason;
+        UReportDoc *report = Desk::reports().front();
+        EXPECT_EQ(Desk::textOf(*report), QString::fromUtf8(row.text)) << row.reason;
+        EXPECT_EQ(UApplication::Get()->GetCurrentReport(), report) << row.reason;
+        ASSERT_NE(desk.frame->GetActiveView(), nullptr) << row.reason;
+        EXPECT_EQ(desk.frame->GetActiveView()->GetDocument(), report) << row.reason;
+        EXPECT_EQ(UApplication::Get()->GetRecentFileList().value(0), folder.path(row.name)) << row.reason;
+    }
+}
+
+TEST(DeskFrame, AFileThatIsNotThereIsSaid)
+{
+    Desk desk;
+    const JobFolder folder;
+    for (const char *name : {"gone.rep", "gone.json", "."}) {
+        desk.messages.clear();
+        EXPECT_FALSE(desk.frame->OpenFile(folder.path(name))) << name;
+        EXPECT_EQ(desk.messages.size(), 1) << name;
+        EXPECT_TRUE(Desk::reports().empty()) << name;
+    }
+    EXPECT_TRUE(UApplication::Get()->GetRecentFileList().isEmpty()) << "what could not be opened is not offered again";
+}
+
+TEST(DeskFrame, JobsAreMadeWithThePreferencesUnlessTheySayOtherwise)
+{
+    Desk desk;
+    DeskPreferences preferences = loadPreferences();
+    preferences.settings.lengthUnit = LengthUnit::InternationalFoot;
+    preferences.fontSize = 11;
+    preferences.margins = QMargins(500, 600, 700, 800);
+    preferences.portrait = false;
+    savePreferences(preferences);
+    const JobFolder folder;
+    folder.put("a.json", R"({"report": [{"line": "x"}]})");
+    folder.put("b.json", R"({"report": [{"line": "x"}], "settings": {"lengthUnit": "km"},
+                             "page": {"fontSize": 7, "margins": [1, 2, 3, 4], "orientation": "portrait"}})");
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.json")));
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("b.json")));
+    const auto reports = Desk::reports();
+    ASSERT_EQ(reports.size(), 2U);
+    EXPECT_EQ(reports[0]->GetJobSettings().lengthUnit, LengthUnit::InternationalFoot);
+    EXPECT_EQ(reports[0]->GetFontSize(), 11U);
+    EXPECT_EQ(reports[0]->GetMargins(), QMargins(500, 600, 700, 800));
+    EXPECT_GT(reports[0]->GetPageSize().width(), reports[0]->GetPageSize().height()) << "landscape";
+    EXPECT_EQ(reports[1]->GetJobSettings().lengthUnit, LengthUnit::Kilometre);
+    EXPECT_EQ(reports[1]->GetFontSize(), 7U);
+    EXPECT_EQ(reports[1]->GetMargins(), QMargins(1, 2, 3, 4));
+    EXPECT_LT(reports[1]->GetPageSize().width(), reports[1]->GetPageSize().height());
+    EXPECT_EQ(loadPreferences().fontSize, 11U) << "a job does not change what the user has chosen";
+    EXPECT_FALSE(loadPreferences().portrait);
+}
+
+TEST(DeskFrame, ATemplateAndADataFileMakeAReport)
+{
+    const CommandLineFolder folder;
+    Desk desk;
+    QStringList asked;
+    desk.frame->askTemplate = [&](const QString &templateFile) -> std::optional<TemplateJob> {
+        asked.append(templateFile);
+        return TemplateJob{folder.path("t.xml"), QStringLiteral("CONTROL"), QStringLiteral("Points"), QString(),
+                           folder.path("points.csv")};
+    };
+    EXPECT_TRUE(desk.frame->OpenFile(folder.path("t.xml")));
+    EXPECT_TRUE(desk.frame->OnCommand(fileFromTemplateCommand));
+    EXPECT_EQ(asked, QStringList({folder.path("t.xml"), QString()})) << "a template that is opened is the one proposed";
+    ASSERT_EQ(Desk::reports().size(), 2U);
+    EXPECT_EQ(Desk::textOf(*Desk::reports().front()), Desk::textOf(*Desk::reports().back()));
+    EXPECT_FALSE(Desk::reports().front()->IsEmpty());
+    desk.frame->askTemplate = [](const QString &) { return std::nullopt; };
+    EXPECT_TRUE(desk.frame->OnCommand(fileFromTemplateCommand));
+    EXPECT_EQ(Desk::reports().size(), 2U) << "cancelled";
+    EXPECT_TRUE(desk.messages.isEmpty());
+}
+
+TEST(DeskFrame, EveryMenuEntryHasTextAndNoTwoTheSameKey)
+{
+    Desk desk;
+    QStringList entries;
+    QStringList keys;
+    for (const QAction *action : desk.frame->menuBar()->actions()) {
+        collect(*action->menu(), entries);
+    }
+    for (const char *entry : {"&New",
+                              "&Open...",
+                              "&Close",
+                              "&Save",
+                              "Save &As...",
+                              "Update Text",
+                              "&Print...",
+                              "Print Pre&view",
+                              "Pa&ge Setup...",
+                              "Recent File",
+                              "E&xit",
+                              "&Undo",
+                              "Cu&t",
+                              "&Copy",
+                              "&Paste",
+                              "&Toolbar",
+                              "&Status Bar",
+                              "&New Window",
+                              "&Cascade",
+                              "&Tile Horizontally",
+                              "Tile Vertically",
+                              "&Arrange Icons",
+                              "&Help",
+                              "&About..."})
+    {
+        EXPECT_TRUE(entries.contains(QString::fromUtf8(entry))) << entry;
+    }
+    for (const QAction *action : desk.frame->findChildren<QAction *>()) {
+        for (const QKeySequence &key : action->shortcuts()) {
+            EXPECT_FALSE(keys.contains(key.toString())) << key.toString().toStdString();
+            keys.append(key.toString());
+        }
+    }
+    const std::pair<unsigned, const char *> given[] = {{fileNewCommand, "Ctrl+N"},  {fileOpenCommand, "Ctrl+O"},
+                                                       {fileSaveCommand, "Ctrl+S"}, {filePrintCommand, "Ctrl+P"},
+                                                       {undoCommand, "Ctrl+Z"},     {cutCommand, "Ctrl+X"},
+                                                       {copyCommand, "Ctrl+C"},     {pasteCommand, "Ctrl+V"}};
+    for (const auto &[id, key] : given) {
+        EXPECT_EQ(desk.frame->CommandAction(id)->shortcut().toString(), QString::fromUtf8(key));
+    }
+}
+
+TEST(DeskFrame, CommandsFollowWhetherAReportIsOpen)
+{
+    Desk desk;
+    desk.frame->UpdateCommands();
+    const unsigned needing[] = {fileSaveCommand,     fileSaveAsCommand, filePrintCommand,
+                                printPreviewCommand, pageSetupCommand,  copyCommand,
+                                findCommand,         windowNewCommand,  windowCascadeCommand};
+    for (const unsigned id : needing) {
+        EXPECT_FALSE(desk.frame->CommandAction(id)->isEnabled()) << id;
+    }
+    for (const unsigned id :
+         {unsigned(fileNewCommand), unsigned(fileOpenCommand), unsigned(exitCommand), unsigned(preferencesCommand)})
+    {
+        EXPECT_TRUE(desk.frame->CommandAction(id)->isEnabled()) << id;
+    }
+    ASSERT_TRUE(desk.frame->OnCommand(fileNewCommand));
+    desk.frame->UpdateCommands();
+    for (const unsigned id : needing) {
+        EXPECT_TRUE(desk.frame->CommandAction(id)->isEnabled()) << id;
+    }
+    EXPECT_FALSE(desk.frame->CommandAction(updateTextCommand)->isEnabled()) << "the report is nobody's object";
+    EXPECT_TRUE(desk.frame->CommandAction(viewToolBarCommand)->isChecked());
+    ASSERT_TRUE(desk.frame->OnCommand(viewToolBarCommand));
+    desk.frame->UpdateCommands();
+    EXPECT_FALSE(desk.frame->CommandAction(viewToolBarCommand)->isChecked());
+}
+
+TEST(DeskFrame, WindowsOfAReportAreTiledAndJoined)
+{
+    Desk desk;
+    ASSERT_TRUE(desk.frame->OnCommand(fileNewCommand));
+    ASSERT_TRUE(desk.frame->OnCommand(windowNewCommand));
+    ASSERT_TRUE(desk.frame->OnCommand(windowNewCommand));
+    const auto docks = desk.frame->findChildren<QDockWidget *>(QString(), Qt::FindDirectChildrenOnly);
+    ASSERT_EQ(docks.size(), 3);
+    EXPECT_EQ(docks[2]->windowTitle(), QStringLiteral("Report:3")) << "panes of one report are numbered";
+    docks[1]->setFloating(true);
+    ASSERT_TRUE(desk.frame->OnCommand(windowTileHorizontallyCommand));
+    QCoreApplication::processEvents();
+    EXPECT_FALSE(docks[1]->isFloating());
+    for (qsizetype i = 1; i < docks.size(); ++i) {
+        EXPECT_GT(docks[i]->y(), docks[i - 1]->y()) << "one above the other";
+        EXPECT_EQ(docks[i]->x(), docks[0]->x());
+    }
+    ASSERT_TRUE(desk.frame->OnCommand(windowTileVerticallyCommand));
+    QCoreApplication::processEvents();
+    for (qsizetype i = 1; i < docks.size(); ++i) {
+        EXPECT_GT(docks[i]->x(), docks[i - 1]->x()) << "side by side";
+    }
+    ASSERT_TRUE(desk.frame->OnCommand(windowCascadeCommand));
+    EXPECT_EQ(desk.frame->tabifiedDockWidgets(docks[0]).size(), 2);
+    desk.answer = MessageAnswer::No;
+}
+
+TEST(DeskFrame, ClosingAsksForEveryReportThatHasChanged)
+{
+    struct Row
+    {
+        MessageAnswer answer;
+        bool closes;
+        const char *reason;
+    };
+    for (const Row &row : {Row{MessageAnswer::No, true, "the changes are given up"},
+                           Row{MessageAnswer::Cancel, false, "cancelled: everything stays"},
+                           Row{MessageAnswer::Yes, false, "the name is asked for and not given: everything stays"}})
+    {
+        Desk desk;
+        ASSERT_TRUE(desk.frame->OnCommand(fileNewCommand));
+        ASSERT_TRUE(desk.frame->OnCommand(fileNewCommand));
+        Desk::reports().back()->WriteLine(QStringLiteral("x"), 0, 1, 0);
+        desk.answer = row.answer;
+        desk.frame->close();
+        EXPECT_EQ(desk.frame->isHidden(), row.closes) << row.reason;
+        EXPECT_EQ(desk.messages.size(), 1) << row.reason << ": the other report has not changed";
+        EXPECT_EQ(Desk::reports().size(), row.closes ? 0U : 2U) << row.reason;
+        desk.answer = MessageAnswer::No;
+    }
+}
+
+TEST(DeskFrame, LayoutAndRecentFilesComeBack)
+{
+    const JobFolder folder;
+    folder.put("a.rep", "TALVEN\r\r\n");
+    folder.put("b.rep", "TALVEN\r\r\n");
+    Desk desk;
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.rep")));
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("b.rep")));
+    ASSERT_TRUE(desk.frame->OnCommand(viewToolBarCommand));
+    desk.frame->resize(700, 500);
+    desk.frame->close();
+    desk.frame.reset();
+    desk.application.reset();
+    desk.application.emplace();
+    desk.frame.emplace();
+    desk.frame->show();
+    EXPECT_EQ(desk.frame->size(), QSize(700, 500));
+    EXPECT_FALSE(desk.frame->findChild<QToolBar *>()->isVisible());
+    EXPECT_EQ(UApplication::Get()->GetRecentFileList(), QStringList({folder.path("b.rep"), folder.path("a.rep")}));
+}
+
+TEST(DeskFrame, WhatIsDroppedIsOpened)
+{
+    const JobFolder folder;
+    folder.put("a.rep", "TALVEN\r\r\n");
+    folder.put("b.json", lineJob());
+    Desk desk;
+    QMimeData dropped;
+    dropped.setUrls({QUrl::fromLocalFile(folder.path("a.rep")), QUrl(QStringLiteral("https://example.org/x.rep")),
+                     QUrl::fromLocalFile(folder.path("b.json"))});
+    QDragEnterEvent enter(QPoint(9, 9), Qt::CopyAction, &dropped, Qt::LeftButton, Qt::NoModifier);
+    QCoreApplication::sendEvent(&*desk.frame, &enter);
+    EXPECT_TRUE(enter.isAccepted());
+    QDropEvent drop(QPointF(9, 9), Qt::CopyAction, &dropped, Qt::LeftButton, Qt::NoModifier);
+    QCoreApplication::sendEvent(&*desk.frame, &drop);
+    EXPECT_EQ(Desk::reports().size(), 2U) << "files of this machine only";
+    desk.answer = MessageAnswer::No;
+}
+
+TEST(DeskFrame, AFileThatChangesOnTheDiskIsOfferedAgain)
+{
+    struct Row
+    {
+        MessageAnswer answer;
+        bool isEdited;
+        const char *text;
+        const char *reason;
+    };
+    for (const Row &row : {Row{MessageAnswer::Yes, false, "TALVEN new\n\n", "loaded again"},
+                           Row{MessageAnswer::No, false, "TALVEN\n\n", "left as it was read"},
+                           Row{MessageAnswer::Yes, true, "TALVEN new\n\n", "also over changes, when the user says so"},
+                           Row{MessageAnswer::No, true, "xTALVEN\n\n", "the user's changes stay"}})
+    {
+        const JobFolder folder;
+        folder.put("a.rep", "TALVEN\r\r\n");
+        Desk desk;
+        ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.rep")));
+        UReportDoc *report = Desk::reports().front();
+        if (row.isEdited) {
+            QTest::keyClick(&dynamic_cast<UReportView *>(desk.frame->GetActiveView())->GetEdit(), Qt::Key_X);
+        }
+        QTest::qWait(1); // the watch begins behind the opening
+        desk.answer = row.answer;
+        folder.put("a.rep", "TALVEN new\r\r\n");
+        EXPECT_TRUE(QTest::qWaitFor([&desk] { return !desk.messages.isEmpty(); })) << row.reason;
+        EXPECT_EQ(desk.messages.value(0).contains(QStringLiteral("not saved")), row.isEdited) << row.reason;
+        EXPECT_EQ(Desk::textOf(*report), QString::fromUtf8(row.text)) << row.reason;
+        EXPECT_EQ(report->IsModified(), row.isEdited && row.answer == MessageAnswer::No) << row.reason;
+        desk.answer = MessageAnswer::No;
+    }
+}
+
+TEST(DeskFrame, ItsOwnSavesAreNoChangesOfOthers)
+{
+    const JobFolder folder;
+    folder.put("a.rep", "TALVEN\r\r\n");
+    folder.put("other.rep", "TALVEN\r\r\n");
+    Desk desk;
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.rep")));
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("other.rep")));
+    QTest::qWait(1);
+    Desk::reports().front()->WriteLine(QStringLiteral("more"), 0, 1, 0);
+    ASSERT_TRUE(Desk::reports().front()->DoFileSave());
+    QTest::qWait(1);
+    // A change of the other file that is told shows that this one would have been told by then.
+    folder.put("other.rep", "TALVEN changed\r\r\n");
+    EXPECT_TRUE(QTest::qWaitFor([&desk] { return !desk.messages.isEmpty(); }));
+    EXPECT_EQ(desk.messages.size(), 1);
+    EXPECT_TRUE(desk.messages.value(0).contains(QStringLiteral("other.rep")));
+}
+
+} // namespace

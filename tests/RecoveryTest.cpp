@@ -1,0 +1,240 @@
+#include "DeskFixture.h"
+
+#include "FrameFixture.h"
+#include "Recovery.h"
+#include "ReportEdit.h"
+#include "UReportView.h"
+
+#include <QDir>
+#include <QProcess>
+#include <QTemporaryDir>
+
+#include <gtest/gtest.h>
+
+namespace
+{
+
+using kareport::KeptReport;
+using kareport::Recovery;
+
+/// A folder as programs leave it that crash: what one of them kept, without the program.
+class CrashFolder
+{
+public:
+    QString path() const { return folder_.filePath(QStringLiteral("recovery")); }
+    /// The folders of programs in it.
+    QStringList programs() const { return QDir(path()).entryList(QDir::Dirs | QDir::NoDotAndDotDot); }
+    QStringList files(const QString &program) const
+    {
+        return QDir(path() + u'/' + program).entryList(QDir::Files, QDir::Name);
+    }
+    /// Ends a program as a crash does: its files stay, its lock is that of nobody.
+    void crash(std::unique_ptr<Recovery> recovery) const
+    {
+        const QString program = programs().value(0);
+        const QString kept = folder_.filePath(QStringLiteral("kept"));
+        QDir().mkpath(kept);
+        for (const QString &file : files(program)) {
+            QFile::copy(path() + u'/' + program + u'/' + file, kept + u'/' + file);
+        }
+        recovery.reset();
+        QDir().rename(kept, path() + QStringLiteral("/crashed"));
+        // The lock of a process that is no longer there.
+        putFile(path() + QStringLiteral("/crashed/lock"),
+                QByteArray::number(deadProcess()) + "\nka_tests\n" + QSysInfo::machineHostName().toUtf8() + "\n");
+    }
+
+private:
+    static qint64 deadProcess()
+    {
+        QProcess process;
+        process.start(QStringLiteral("true"), QStringList());
+        process.waitForStarted();
+        const qint64 id = process.processId();
+        process.waitForFinished();
+        return id;
+    }
+
+    QTemporaryDir folder_;
+};
+
+UReportDoc *makeReport(const QString &title, const QString &text, bool isModified = true)
+{
+    UReportDoc *report = CreateReport(title, false, false, nullptr, 0, nullptr);
+    report->SetData(text);
+    report->UpdateAllViews(nullptr);
+    report->SetModifiedFlag(isModified);
+    return report;
+}
+
+TEST(Recovery, WhatWasOpenComesBackAfterACrash)
+{
+    const JobFolder files;
+    files.put("saved.rep", "TALVEN saved\r\r\n");
+    files.put("edited.rep", "TALVEN old\r\r\n");
+    const CrashFolder folder;
+    const QString text = QStringLiteral("a\r\n\u00E9 \u4E2D \U0001F600\r\nlast without an end");
+    {
+        Desk desk;
+        desk.answer = MessageAnswer::No;
+        auto recovery = std::make_unique<Recovery>(folder.path());
+        EXPECT_TRUE(recovery->leftReports().empty());
+        makeReport(QStringLiteral("Traverse"), text);
+        makeReport(QStringLiteral("Untouched"), QString(), false);
+        ASSERT_TRUE(desk.frame->OpenFile(files.path("saved.rep")));
+        ASSERT_TRUE(desk.frame->OpenFile(files.path("edited.rep")));
+        Desk::reports().back()->WriteLine(QStringLiteral("new"), 0, 1, 0);
+        recovery->keep();
+        folder.crash(std::move(recovery));
+    }
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    Recovery recovery(folder.path());
+    const std::vector<KeptReport> left = recovery.leftReports();
+    ASSERT_EQ(left.size(), 3U) << "an empty report that nobody wrote into is nothing to bring back";
+    EXPECT_EQ(left[0].title, QStringLiteral("Traverse"));
+    EXPECT_EQ(left[1].path, files.path("saved.rep"));
+    EXPECT_TRUE(left[1].textFile.isEmpty()) << "its own file holds all of it";
+    EXPECT_EQ(left[2].path, files.path("edited.rep"));
+
+    const UReportDoc *unsaved = Recovery::reopen(left[0]);
+    ASSERT_NE(unsaved, nullptr);
+    EXPECT_EQ(unsaved->CopyText(), text) << "to the character";
+    EXPECT_EQ(unsaved->GetTitle(), QStringLiteral("Traverse"));
+    EXPECT_TRUE(unsaved->IsModified()) << "closing it asks";
+    EXPECT_TRUE(unsaved->GetPathName().isEmpty());
+    const UReportDoc *saved = Recovery::reopen(left[1]);
+    ASSERT_NE(saved, nullptr);
+    EXPECT_FALSE(saved->IsModified());
+    const UReportDoc *edited = Recovery::reopen(left[2]);
+    ASSERT_NE(edited, nullptr);
+    EXPECT_TRUE(edited->CopyText().endsWith(QStringLiteral("new\r\n")));
+    EXPECT_EQ(edited->GetPathName(), files.path("edited.rep")) << "saving it goes to its file";
+    EXPECT_TRUE(edited->IsModified());
+    EXPECT_EQ(files.bytesOf("edited.rep"), "TALVEN old\r\r\n") << "which is only written by saving";
+
+    recovery.discardLeft();
+    EXPECT_TRUE(Recovery(folder.path()).leftReports().empty());
+}
+
+TEST(Recovery, FormatsOfAnEditedRichTextComeBack)
+{
+    const CrashFolder folder;
+    {
+        Desk desk;
+        desk.answer = MessageAnswer::No;
+        auto recovery = std::make_unique<Recovery>(folder.path());
+        UReportDoc *report = makeReport(QStringLiteral("R"), QStringLiteral("{\\rtf1 {\\b bold}}"));
+        QTest::keyClick(&dynamic_cast<UReportView *>(report->GetViews().front())->GetEdit(), Qt::Key_X);
+        recovery->keep();
+        folder.crash(std::move(recovery));
+    }
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    Recovery recovery(folder.path());
+    ASSERT_EQ(recovery.leftReports().size(), 1U);
+    const UReportDoc *report = Recovery::reopen(recovery.leftReports().front());
+    ASSERT_NE(report, nullptr);
+    const kareport::ReportEdit &edit = dynamic_cast<UReportView *>(report->GetViews().front())->GetEdit();
+    EXPECT_EQ(edit.toPlainText().trimmed(), QStringLiteral("xbold"));
+    QTextCursor cursor(edit.document());
+    cursor.setPosition(3);
+    EXPECT_EQ(cursor.charFormat().fontWeight(), QFont::Bold);
+}
+
+TEST(Recovery, OnlyTheUserCanReadWhatIsKept)
+{
+    const CrashFolder folder;
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    Recovery recovery(folder.path());
+    makeReport(QStringLiteral("R"), QStringLiteral("secret"));
+    recovery.keep();
+    constexpr auto others = QFile::ReadGroup | QFile::ReadOther | QFile::ExeGroup | QFile::ExeOther;
+    EXPECT_FALSE(QFile::permissions(folder.path() + u'/' + folder.programs().value(0)) & others);
+}
+
+TEST(Recovery, ARegularEndLeavesNothing)
+{
+    const CrashFolder folder;
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    {
+        Recovery recovery(folder.path());
+        makeReport(QStringLiteral("R"), QStringLiteral("text"));
+        recovery.keep();
+        EXPECT_EQ(folder.programs().size(), 1);
+    }
+    EXPECT_TRUE(folder.programs().isEmpty());
+}
+
+TEST(Recovery, AProgramThatStillRunsKeepsItsOwn)
+{
+    const CrashFolder folder;
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    Recovery first(folder.path());
+    makeReport(QStringLiteral("R"), QStringLiteral("text"));
+    first.keep();
+    Recovery second(folder.path());
+    EXPECT_TRUE(second.leftReports().empty());
+    second.discardLeft();
+    EXPECT_EQ(folder.programs().size(), 2);
+}
+
+TEST(Recovery, TextsAreWrittenOnceAndGoWithTheirReports)
+{
+    const CrashFolder folder;
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    Recovery recovery(folder.path());
+    UReportDoc *report = makeReport(QStringLiteral("R"), QStringLiteral("text"));
+    recovery.keep();
+    const QString program = folder.programs().value(0);
+    const QString file = folder.path() + u'/' + program + QStringLiteral("/1");
+    ASSERT_EQ(contentOf(file), "text");
+    QFile::remove(file);
+    recovery.keep();
+    EXPECT_FALSE(QFile::exists(file)) << "the text is the one that was written before";
+    report->ReplaceText(0, 1, u"T");
+    recovery.keep();
+    EXPECT_EQ(contentOf(file), "Text") << "a change of the same length is a change";
+    report->WriteLine(QStringLiteral("!"), 0, 0, 0);
+    recovery.keep();
+    EXPECT_EQ(contentOf(file), "Text!");
+    report->SetModifiedFlag(false);
+    recovery.keep();
+    EXPECT_FALSE(QFile::exists(file)) << "what is saved need not be kept";
+    report->SetModifiedFlag(true);
+    recovery.keep();
+    recovery.forget(report);
+    report->OnCloseDocument();
+    recovery.keep();
+    EXPECT_EQ(folder.files(program).filter(QRegularExpression(QStringLiteral("^[0-9]+$"))), QStringList());
+}
+
+TEST(Recovery, SpoiledFilesAreNoReports)
+{
+    struct Row
+    {
+        const char *list;
+        std::size_t count;
+        const char *reason;
+    };
+    for (const Row &row : {Row{"", 0, "an empty list"}, Row{"[{", 0, "a list that was cut off"},
+                           Row{"{}", 0, "no list"}, Row{"[1, null, \"x\"]", 3, "entries without anything"},
+                           Row{R"([{"title": "T", "text": "../../etc/passwd"}])", 1, "a text from elsewhere"}})
+    {
+        const CrashFolder folder;
+        QDir().mkpath(folder.path() + QStringLiteral("/crashed"));
+        putFile(folder.path() + QStringLiteral("/crashed/reports.json"), row.list);
+        Desk desk;
+        Recovery recovery(folder.path());
+        EXPECT_EQ(recovery.leftReports().size(), row.count) << row.reason;
+        for (const KeptReport &kept : recovery.leftReports()) {
+            EXPECT_EQ(Recovery::reopen(kept), nullptr) << row.reason;
+        }
+    }
+}
+
+} // namespace

@@ -1,0 +1,168 @@
+#include "PageSetupForm.h"
+
+#include "PrintGeometry.h"
+#include "Xlate.h"
+
+#include <QComboBox>
+#include <QDoubleSpinBox>
+#include <QGridLayout>
+#include <QGroupBox>
+#include <QHBoxLayout>
+#include <QLabel>
+#include <QLocale>
+#include <QRadioButton>
+#include <QVBoxLayout>
+
+#include <cmath>
+
+namespace kareport
+{
+
+namespace
+{
+
+constexpr int hundredths = 100;       // of a millimetre
+constexpr double mostMargin = 2000.0; // millimetres
+constexpr int columns = 2;
+
+std::array<int, 4> inOrder(const QMargins &margins)
+{
+    return {margins.left(), margins.top(), margins.right(), margins.bottom()};
+}
+
+} // namespace
+
+PageSetupForm::PageSetupForm(const PageSetup &setup, QWidget *parent)
+    : QWidget(parent),
+      setup_(setup),
+      portrait_(new QRadioButton(Xlate("P&ortrait"))),
+      landscape_(new QRadioButton(Xlate("L&andscape"))),
+      printer_(new QComboBox),
+      sheet_(new QLabel),
+      warning_(new QLabel)
+{
+    auto *layout = new QVBoxLayout(this);
+    layout->setContentsMargins(0, 0, 0, 0);
+    auto *printerRow = new QWidget;
+    auto *printerLayout = new QHBoxLayout(printerRow);
+    printerLayout->setContentsMargins(0, 0, 0, 0);
+    auto *printerLabel = new QLabel(Xlate("&Printer:"));
+    printerLabel->setBuddy(printer_);
+    printer_->setAccessibleName(Xlate("Printer"));
+    printer_->addItems(setup.printers);
+    printer_->setCurrentText(setup.printer);
+    printerLayout->addWidget(printerLabel);
+    printerLayout->addWidget(printer_, 1);
+    printerRow->setVisible(setup.printers.size() > 1);
+    layout->addWidget(printerRow);
+
+    auto *orientation = new QGroupBox(Xlate("Orientation"));
+    auto *orientationLayout = new QVBoxLayout(orientation);
+    auto *choices = new QHBoxLayout;
+    choices->addWidget(portrait_);
+    choices->addWidget(landscape_);
+    choices->addStretch();
+    orientationLayout->addLayout(choices);
+    orientationLayout->addWidget(sheet_);
+    (setup.portrait ? portrait_ : landscape_)->setChecked(true);
+    layout->addWidget(orientation);
+
+    auto *margins = new QGroupBox(Xlate("Margins"));
+    auto *marginsLayout = new QGridLayout(margins);
+    const std::array<QString, 4> labels = {Xlate("&Left:"), Xlate("&Top:"), Xlate("&Right:"), Xlate("&Bottom:")};
+    const std::array<QString, 4> names = {Xlate("Left margin"), Xlate("Top margin"), Xlate("Right margin"),
+                                          Xlate("Bottom margin")};
+    // Left and right stand side by side, top and bottom below them.
+    constexpr std::array<std::pair<int, int>, 4> places = {{{0, 0}, {1, 0}, {0, 1}, {1, 1}}};
+    for (std::size_t i = 0; i < margins_.size(); ++i) {
+        auto *field = new QDoubleSpinBox;
+        field->setDecimals(2);
+        field->setRange(0, mostMargin);
+        field->setSuffix(Xlate(" mm"));
+        field->setValue(double(inOrder(setup.margins).at(i)) / hundredths);
+        field->setAccessibleName(names.at(i));
+        auto *label = new QLabel(labels.at(i));
+        label->setBuddy(field);
+        marginsLayout->addWidget(label, places.at(i).first, columns * places.at(i).second);
+        marginsLayout->addWidget(field, places.at(i).first, columns * places.at(i).second + 1);
+        connect(field, &QDoubleSpinBox::valueChanged, this, &PageSetupForm::checkMargins);
+        margins_.at(i) = field;
+    }
+    QWidget::setTabOrder(margins_[0], margins_[2]);
+    QWidget::setTabOrder(margins_[2], margins_[1]);
+    QWidget::setTabOrder(margins_[1], margins_[3]);
+    layout->addWidget(margins);
+
+    warning_->setWordWrap(true);
+    warning_->setObjectName(QStringLiteral("warning"));
+    warning_->hide();
+    layout->addWidget(warning_);
+
+    connect(portrait_, &QRadioButton::toggled, this, &PageSetupForm::showSheet);
+    connect(printer_, &QComboBox::currentIndexChanged, this, &PageSetupForm::showSheet);
+    showSheet();
+    setFocusProxy(margins_[0]);
+    margins_[0]->selectAll();
+}
+
+PageSetup PageSetupForm::setup() const
+{
+    PageSetup setup = setup_;
+    setup.portrait = portrait_->isChecked();
+    if (setup_.printers.size() > 1) {
+        setup.printer = printer_->currentText();
+    }
+    std::array<int, 4> margins = inOrder(setup_.margins);
+    for (std::size_t i = 0; i < margins_.size(); ++i) {
+        margins.at(i) = static_cast<int>(std::lround(margins_.at(i)->value() * hundredths));
+    }
+    setup.margins = QMargins(margins[0], margins[1], margins[2], margins[3]);
+    return setup;
+}
+
+bool PageSetupForm::leavesRoom() const
+{
+    const PageSetup chosen = setup();
+    const QSizeF upright = setup_.sheetOf ? setup_.sheetOf(chosen.printer) : QSizeF();
+    if (upright.isEmpty()) {
+        return true; // nothing is known of the sheet
+    }
+    const QSizeF sheet = chosen.portrait ? upright : upright.transposed();
+    return kareport::leavesRoom({twipsOfMillimetres(sheet.width()), twipsOfMillimetres(sheet.height())},
+                                twipsOfHundredths(chosen.margins));
+}
+
+void PageSetupForm::showSheet()
+{
+    const QSizeF upright = setup_.sheetOf ? setup_.sheetOf(setup().printer) : QSizeF();
+    const QSizeF sheet = portrait_->isChecked() ? upright : upright.transposed();
+    const QLocale locale;
+    sheet_->setText(
+        Xlate("Paper: %1 x %2 mm")
+            .arg(locale.toString(std::lround(sheet.width())), locale.toString(std::lround(sheet.height()))));
+    sheet_->setVisible(!upright.isEmpty());
+    checkMargins();
+}
+
+void PageSetupForm::checkMargins()
+{
+    // Said when the user wants to leave, not while he is still typing; taken back as soon as it is no longer true.
+    if (!warning_->isHidden() && leavesRoom()) {
+        warning_->hide();
+    }
+}
+
+bool PageSetupForm::confirm()
+{
+    if (leavesRoom()) {
+        return true;
+    }
+    warning_->setText(Xlate("These margins leave no room for text on the paper. Choose smaller margins."));
+    warning_->setAccessibleName(warning_->text());
+    warning_->show();
+    margins_[0]->setFocus();
+    margins_[0]->selectAll();
+    return false;
+}
+
+} // namespace kareport
