@@ -88,7 +88,7 @@ TEST(CViewPane, OwnsItsViews)
     EXPECT_TRUE(document.GetViews().empty());
 }
 
-TEST(CViewPane, ActiveDocumentIsTheFirstViews)
+TEST(CViewPane, ActiveDocumentIsThatOfTheViewThatIsShown)
 {
     FrameLog log;
     TextDocument first(log);
@@ -98,6 +98,8 @@ TEST(CViewPane, ActiveDocumentIsTheFirstViews)
     auto *pane = new RecordingPane(log);
     addRecordingView(*pane, first);
     addRecordingView(*pane, second);
+    EXPECT_EQ(pane->GetActiveDocument(), &second) << "the view that came last took the place of the other";
+    pane->RemoveView(second.GetViews().front());
     EXPECT_EQ(pane->GetActiveDocument(), &first);
 }
 

@@ -208,6 +208,49 @@ TEST(UReportViewPrint, AnotherSheetThatTheUserChoosesIsPrintedOn)
     EXPECT_EQ(printing.printedPages(), 2) << "210 mm are 53 lines high";
 }
 
+TEST(UReportViewPrint, ASheetWithoutRoomBetweenTheMarginsIsRefused)
+{
+    AnsweredPrinting printing;
+    const AnsweredMessages messages(MessageAnswer::Ok);
+    printing.changePrinter = [](QPrinter &printer) { printer.setPageSize(QPageSize(QPageSize::A6)); };
+    ShownReport report;
+    writeLines(report.report, 3);
+    report.report.SetMargins(QMargins(6000, 1000, 6000, 1000)); // room on A4, none on A6
+    UReportView &view = report.open();
+    view.OnReportPrint();
+    EXPECT_THAT(messages.texts, ElementsAre(testing::Truly([](const QString &text) { return text.contains(u"room"); })));
+    EXPECT_EQ(printing.prints, 1) << "the sheet was chosen in the window that asks";
+    EXPECT_FALSE(QFile::exists(printing.file()));
+}
+
+TEST(UReportViewPrint, APageThatTakesNothingIsNotFollowedByOthers)
+{
+    PreparedView prepared(3);
+    UReportView &view = *prepared.view;
+    prepared.report.report.SetMargins(QMargins(11000, 1000, 11000, 1000));
+    EXPECT_FALSE(view.OnPreparePrinting(prepared.info));
+    QPainter painter(&prepared.printer);
+    view.OnBeginPrinting(painter, prepared.info);
+    view.OnPrint(painter, prepared.info);
+    EXPECT_THAT(view.GetPageStarts(), ElementsAre(0));
+}
+
+TEST(UReportViewPrint, PrintingDirectlyAsksNobody)
+{
+    AnsweredPrinting printing;
+    ShownReport report;
+    writeLines(report.report, 3);
+    UReportView &view = report.open();
+    report.report.SetPageSize();
+    PrintInfo info;
+    info.direct = true;
+    ASSERT_TRUE(view.OnPreparePrinting(info));
+    EXPECT_EQ(printing.prints, 0);
+    info.direct = false;
+    ASSERT_TRUE(view.OnPreparePrinting(info));
+    EXPECT_EQ(printing.prints, 1) << "the other print commands ask";
+}
+
 TEST(UReportViewPrint, WithoutAPrinterEveryCommandSaysSo)
 {
     const AnsweredPrinting printing;

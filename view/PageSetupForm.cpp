@@ -88,6 +88,7 @@ PageSetupForm::PageSetupForm(const PageSetup &setup, QWidget *parent)
         connect(field, &QDoubleSpinBox::valueChanged, this, &PageSetupForm::checkMargins);
         margins_.at(i) = field;
     }
+    marginsLayout->setColumnStretch(2 * columns, 1);
     QWidget::setTabOrder(margins_[0], margins_[2]);
     QWidget::setTabOrder(margins_[2], margins_[1]);
     QWidget::setTabOrder(margins_[1], margins_[3]);

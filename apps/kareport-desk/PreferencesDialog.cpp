@@ -53,6 +53,7 @@ PreferencesDialog::PreferencesDialog(const DeskPreferences &preferences, QWidget
     auto *page = new QWidget;
     auto *pageLayout = new QVBoxLayout(page);
     auto *fontRow = new QFormLayout;
+    fontRow->setFieldGrowthPolicy(QFormLayout::FieldsStayAtSizeHint);
     fontRow->addRow(Xlate("&Font size of new reports:"), fontSize_);
     pageLayout->addLayout(fontRow);
     pageLayout->addWidget(page_);
@@ -66,6 +67,7 @@ PreferencesDialog::PreferencesDialog(const DeskPreferences &preferences, QWidget
     language_->setAccessibleName(Xlate("Language"));
     auto *program = new QWidget;
     auto *programLayout = new QFormLayout(program);
+    programLayout->setFieldGrowthPolicy(QFormLayout::FieldsStayAtSizeHint);
     programLayout->addRow(Xlate("&Language (from the next start):"), language_);
 
     tabs_->addTab(units_, Xlate("&Units and Formats"));

@@ -176,6 +176,9 @@ void TemplateDialog::check()
     if (message.isEmpty() && !data_->text().isEmpty() && !QFileInfo(data_->text()).isFile()) {
         message = Xlate("There is no data file \"%1\".").arg(data_->text());
     }
+    if (!message.isEmpty()) {
+        message[0] = message[0].toUpper(); // what is wrong with a file is said as the end of a sentence
+    }
     message_->setText(message);
     buttons_->button(QDialogButtonBox::Ok)
         ->setEnabled(message.isEmpty() && output_->currentIndex() >= 0 && !data_->text().isEmpty());

@@ -1,0 +1,153 @@
+// Draws every window of the programs into PNG files, to be looked at and for the guides.
+#include "DeskApplication.h"
+#include "DeskCommandIds.h"
+#include "DeskFrame.h"
+#include "FindBar.h"
+#include "PageBar.h"
+#include "PageSetupDialog.h"
+#include "PreferencesDialog.h"
+#include "PrintProgress.h"
+#include "Profile.h"
+#include "ReportPrinter.h"
+#include "ReportViewWidget.h"
+#include "TemplateDialog.h"
+#include "UReportView.h"
+
+#include <QApplication>
+#include <QCommandLineParser>
+#include <QDir>
+#include <QLineEdit>
+#include <QMenu>
+#include <QMenuBar>
+#include <QStyleFactory>
+#include <QTabWidget>
+#include <QToolBar>
+
+#include <cstdio>
+
+namespace
+{
+
+QPalette darkPalette()
+{
+    QPalette palette(QColor(53, 53, 53), QColor(42, 42, 42));
+    palette.setColor(QPalette::Base, QColor(30, 30, 30));
+    palette.setColor(QPalette::AlternateBase, QColor(40, 40, 40));
+    palette.setColor(QPalette::Text, Qt::white);
+    palette.setColor(QPalette::WindowText, Qt::white);
+    palette.setColor(QPalette::ButtonText, Qt::white);
+    palette.setColor(QPalette::PlaceholderText, QColor(150, 150, 150));
+    palette.setColor(QPalette::Highlight, QColor(61, 142, 201));
+    palette.setColor(QPalette::HighlightedText, Qt::white);
+    palette.setColor(QPalette::ToolTipBase, QColor(60, 60, 60));
+    palette.setColor(QPalette::ToolTipText, Qt::white);
+    for (const auto role : {QPalette::Text, QPalette::WindowText, QPalette::ButtonText}) {
+        palette.setColor(QPalette::Disabled, role, QColor(130, 130, 130));
+    }
+    return palette;
+}
+
+class Pictures
+{
+public:
+    Pictures(QString folder, QString suffix) : folder_(std::move(folder)), suffix_(std::move(suffix)) {}
+
+    void take(QWidget &window, const char *name)
+    {
+        window.show();
+        QCoreApplication::processEvents();
+        QCoreApplication::sendPostedEvents();
+        const QString path = QDir(folder_).filePath(QString::fromLatin1(name) + suffix_ + QStringLiteral(".png"));
+        isWritten_ = window.grab().save(path) && isWritten_;
+        std::printf("%s\n", qPrintable(path));
+    }
+    bool isWritten() const { return isWritten_; }
+
+private:
+    QString folder_;
+    QString suffix_;
+    bool isWritten_ = true;
+};
+
+void takeDesk(Pictures &pictures, const QString &examples)
+{
+    DeskApplication application;
+    DeskFrame frame;
+    pictures.take(frame, "desk-empty");
+    frame.OpenFile(QDir(examples).filePath(QStringLiteral("stakeout.json")));
+    pictures.take(frame, "desk-report");
+    for (QAction *menu : frame.menuBar()->actions()) {
+        menu->menu()->popup(QPoint());
+        pictures.take(*menu->menu(), qPrintable(QStringLiteral("desk-menu-") + menu->text().remove(u'&').toLower()));
+        menu->menu()->close();
+    }
+    auto *view = dynamic_cast<UReportView *>(frame.GetActiveView());
+    if (view != nullptr) {
+        auto &window = *dynamic_cast<kareport::ReportViewWidget *>(view->GetWidget());
+        window.openFindBar();
+        window.findBar().field().setText(QStringLiteral("12"));
+        pictures.take(frame, "desk-find");
+        window.findBar().close();
+        window.openPageBar();
+        pictures.take(frame, "desk-page");
+        window.pageBar().close();
+    }
+    frame.OnCommand(kareport::windowNewCommand);
+    frame.OnCommand(kareport::windowTileVerticallyCommand);
+    pictures.take(frame, "desk-tiled");
+    for (UDocument *document : application.GetDocTemplates().front()->GetDocuments()) {
+        document->SetModifiedFlag(false);
+    }
+}
+
+void takeDialogs(Pictures &pictures, const QString &examples)
+{
+    kareport::PreferencesDialog preferences(kareport::loadPreferences());
+    auto *tabs = preferences.findChild<QTabWidget *>();
+    const char *const names[] = {"preferences-units", "preferences-page", "preferences-editor", "preferences-program"};
+    for (int i = 0; i < tabs->count(); ++i) {
+        tabs->setCurrentIndex(i);
+        pictures.take(preferences, names[i]);
+    }
+    kareport::TemplateDialog fromTemplate;
+    fromTemplate.setTemplateFile(QDir(examples).filePath(QStringLiteral("survey.xml")));
+    fromTemplate.setData(QDir(examples).filePath(QStringLiteral("data/control.csv")));
+    pictures.take(fromTemplate, "template");
+    fromTemplate.setTemplateFile(QDir(examples).filePath(QStringLiteral("data/control.csv")));
+    pictures.take(fromTemplate, "template-wrong");
+    kareport::PageSetup setup;
+    setup.margins = QMargins(1000, 1000, 1200, 2000);
+    kareport::fillPrinters(setup);
+    setup.printers = {QStringLiteral("Office"), QStringLiteral("Plotter")};
+    kareport::PageSetupDialog pageSetup(setup);
+    pictures.take(pageSetup, "page-setup");
+}
+
+} // namespace
+
+int main(int argc, char **argv)
+{
+    qputenv("QT_QPA_PLATFORM", "offscreen");
+    QApplication application(argc, argv);
+    QApplication::setApplicationName(QStringLiteral("KaReport"));
+    QCommandLineParser parser;
+    parser.addPositionalArgument(QStringLiteral("FOLDER"), QStringLiteral("where the pictures go"));
+    const QCommandLineOption dark(QStringLiteral("dark"), QStringLiteral("light text on a dark background"));
+    const QCommandLineOption examples(QStringLiteral("examples"), QStringLiteral("folder of the examples"),
+                                      QStringLiteral("FOLDER"), QStringLiteral("examples"));
+    const QCommandLineOption suffix(QStringLiteral("suffix"), QStringLiteral("of the files' names"),
+                                    QStringLiteral("TEXT"));
+    parser.addOptions({dark, examples, suffix});
+    parser.process(application);
+    QApplication::setStyle(QStyleFactory::create(QStringLiteral("Fusion")));
+    if (parser.isSet(dark)) {
+        QApplication::setPalette(darkPalette());
+    }
+    kareport::setProfileStore(kareport::makeMemoryProfile());
+    const QString folder = parser.positionalArguments().value(0, QStringLiteral("."));
+    QDir().mkpath(folder);
+    Pictures pictures(folder, parser.value(suffix));
+    takeDesk(pictures, parser.value(examples));
+    takeDialogs(pictures, parser.value(examples));
+    return pictures.isWritten() ? 0 : 1;
+}
