@@ -1,21 +1,25 @@
 include(CMakePackageConfigHelpers)
 
+# Three components: library, development, programs.
 install(TARGETS KaReportHost KaReport EXPORT KaReportTargets
-        LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR})
+        LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR} COMPONENT library NAMELINK_COMPONENT development)
 foreach(library KaReportHost KaReport)
     get_property(headers TARGET ${library} PROPERTY KA_INSTALLED_HEADERS)
-    install(FILES ${headers} DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}/KaReport)
+    install(FILES ${headers} DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}/KaReport COMPONENT development)
 endforeach()
-install(TARGETS kareport kareport-desk RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR})
-install(FILES LICENSES.md CHANGELOG.md DESTINATION ${CMAKE_INSTALL_DOCDIR})
-install(FILES examples/survey.xml DESTINATION ${CMAKE_INSTALL_DATADIR}/kareport/templates)
-install(FILES docs/kareport.1 DESTINATION ${CMAKE_INSTALL_MANDIR}/man1)
+install(TARGETS kareport kareport-desk RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR} COMPONENT programs)
+install(FILES LICENSES.md CHANGELOG.md DESTINATION ${CMAKE_INSTALL_DOCDIR} COMPONENT programs)
+install(FILES examples/survey.xml DESTINATION ${CMAKE_INSTALL_DATADIR}/kareport/templates COMPONENT library)
+install(FILES docs/kareport.1 docs/kareport-desk.1 DESTINATION ${CMAKE_INSTALL_MANDIR}/man1 COMPONENT programs)
+install(FILES packaging/kareport-desk.desktop DESTINATION ${CMAKE_INSTALL_DATADIR}/applications COMPONENT programs)
+install(FILES packaging/kareport.svg DESTINATION ${CMAKE_INSTALL_DATADIR}/icons/hicolor/scalable/apps COMPONENT programs)
+install(FILES packaging/kareport.xml DESTINATION ${CMAKE_INSTALL_DATADIR}/mime/packages COMPONENT programs)
 
 set(config_dir ${CMAKE_INSTALL_LIBDIR}/cmake/KaReport)
-install(EXPORT KaReportTargets NAMESPACE KaReport:: DESTINATION ${config_dir})
+install(EXPORT KaReportTargets NAMESPACE KaReport:: DESTINATION ${config_dir} COMPONENT development)
 configure_package_config_file(cmake/KaReportConfig.cmake.in ${CMAKE_CURRENT_BINARY_DIR}/KaReportConfig.cmake
                               INSTALL_DESTINATION ${config_dir})
 write_basic_package_version_file(${CMAKE_CURRENT_BINARY_DIR}/KaReportConfigVersion.cmake
                                  COMPATIBILITY SameMinorVersion)
 install(FILES ${CMAKE_CURRENT_BINARY_DIR}/KaReportConfig.cmake ${CMAKE_CURRENT_BINARY_DIR}/KaReportConfigVersion.cmake
-        DESTINATION ${config_dir})
+        DESTINATION ${config_dir} COMPONENT development)

@@ -54,6 +54,7 @@ PageDevice builtInDevice(bool portrait)
 PageDevice printerDevice(const QPrinterInfo &info, bool portrait)
 {
     QPrinter printer(info, QPrinter::HighResolution);
+    setSelectedSheet(printer);
     printer.setPageOrientation(portrait ? QPageLayout::Portrait : QPageLayout::Landscape);
     return {printer.pageLayout().fullRectPixels(printer.resolution()).size(), printer.resolution()};
 }
@@ -93,6 +94,13 @@ QPrinterInfo applicationPrinter()
 QPageSize builtInSheet()
 {
     return QPageSize(sheetOf(defaultPrinter().paper));
+}
+
+void setSelectedSheet(QPrinter &printer)
+{
+    if (const QSize sheet = defaultPrinter().sheet; !sheet.isEmpty()) {
+        printer.setPageSize(QPageSize(sheet));
+    }
 }
 
 std::optional<PageDevice> defaultPageDevice(bool portrait)

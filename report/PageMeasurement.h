@@ -9,6 +9,7 @@
 #include <optional>
 
 class QPageSize;
+class QPrinter;
 class QPrinterInfo;
 
 namespace kareport
@@ -51,6 +52,8 @@ KAREPORT_EXPORT std::optional<PageDevice> defaultPageDevice(bool portrait);
 /// The installed printer that the application prints on: the one that the user has selected, or the system's default. Null
 /// when there is none, or when the host has not chosen the system's printers.
 KAREPORT_EXPORT QPrinterInfo applicationPrinter();
+/// Sets an installed printer to the sheet that the user has selected, if one is.
+KAREPORT_EXPORT void setSelectedSheet(QPrinter &printer);
 /// The sheet of the built-in page device.
 KAREPORT_EXPORT QPageSize builtInSheet();
 

@@ -317,7 +317,7 @@ private:
     bool saveText(const QString &path);
     std::optional<bool> saveViewAsRichText(const QString &path);
     /// Opens a file that was saved in the user's preferred editor, if the report is marked for it.
-    void openSavedFile(const QString &path) const;
+    void openSavedFile(const QString &path);
     void openInEditor(const QString &editor);
     /// Saves under a temporary name, or under the next one that is free, in a file that only the user can read.
     /// @return the name; empty when no name is free

@@ -38,10 +38,10 @@ QString availableEditor()
     return IsFileExisting(editor) != 0 ? editor : QString();
 }
 
-void startEditor(const QString &editor, const QString &file)
+void startEditor(const QString &editor, const QString &file, UDocument &report)
 {
     if (!file.isEmpty()) {
-        kareport::launchEditor(editor, file, GetTempDir(false));
+        kareport::launchEditor(editor, file, GetTempDir(false), &report);
     }
 }
 
@@ -121,7 +121,7 @@ void UReportDoc::openInEditor(const QString &editor)
     if (IsConvertToOpenInWord(file, editor)) {
         ConvertAndOpenInWord();
     } else {
-        startEditor(editor, file);
+        startEditor(editor, file, *this);
     }
     // While it is being loaded, whoever loads it still needs it.
     if (IsReportAvailable(this) && closeDocument_ && !isSerializing_) {
@@ -205,7 +205,7 @@ void UReportDoc::ReportRTfData()
     const QString name = GetCurrentReportFileName();
     const bool takesRichText = kareport::editorKind(editor, IsOptionExcel()) == EditorKind::WordProcessor;
     const QString richText = takesRichText ? writeRichTextForEditor(name) : QString();
-    startEditor(editor, richText.isEmpty() ? saveForEditor(name) : richText);
+    startEditor(editor, richText.isEmpty() ? saveForEditor(name) : richText, *this);
 }
 
 QString UReportDoc::writeRichTextForEditor(const QString &name) const
@@ -243,11 +243,11 @@ void UReportDoc::showInModule()
     }
 }
 
-void UReportDoc::openSavedFile(const QString &path) const
+void UReportDoc::openSavedFile(const QString &path)
 {
     // Here, and only here, blanks around the path that the user has entered do no harm.
     const QString editor = preferredEditor().trimmed();
     if (externalEditor_ && IsFileExisting(editor) != 0) {
-        kareport::launchEditor(editor, path, QString());
+        kareport::launchEditor(editor, path, QString(), this);
     }
 }

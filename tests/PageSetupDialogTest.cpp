@@ -26,8 +26,12 @@ PageSetup usualSetup()
 {
     PageSetup setup;
     setup.margins = QMargins(1000, 1001, 1200, 2000);
-    setup.sheetOf = [](const QString &printer) {
-        return printer == QStringLiteral("Large") ? QSizeF(297, 420) : QSizeF(210, 297);
+    setup.sheetsOf = [](const QString &printer) {
+        using kareport::PageSheet;
+        const PageSheet a4{QStringLiteral("A4"), QSize(595, 842), QSizeF(210, 297)};
+        const PageSheet a3{QStringLiteral("A3"), QSize(842, 1191), QSizeF(297, 420)};
+        const PageSheet a6{QStringLiteral("A6"), QSize(298, 420), QSizeF(105, 148)};
+        return printer == QStringLiteral("Large") ? std::vector{a3, a4} : std::vector{a4, a6};
     };
     return setup;
 }
@@ -55,6 +59,36 @@ QRadioButton *choice(const PageSetupDialog &dialog, const char *text)
 void press(PageSetupDialog &dialog, QDialogButtonBox::StandardButton button)
 {
     QTest::mouseClick(dialog.findChild<QDialogButtonBox *>()->button(button), Qt::LeftButton);
+}
+
+QComboBox *paperOf(const PageSetupDialog &dialog)
+{
+    for (auto *box : dialog.findChildren<QComboBox *>()) {
+        if (box->accessibleName() == QStringLiteral("Paper")) {
+            return box;
+        }
+    }
+    return nullptr;
+}
+
+TEST(PageSetupDialog, ThePaperIsOneThatThePrinterTakes)
+{
+    PageSetup setup = usualSetup();
+    setup.printer = QStringLiteral("Small");
+    setup.printers = QStringList({QStringLiteral("Small"), QStringLiteral("Large")});
+    PageSetupDialog dialog(setup);
+    EXPECT_EQ(paperOf(dialog)->currentText(), QStringLiteral("A4"));
+    EXPECT_TRUE(dialog.setup().sheet.isEmpty()) << "the printer's own stays whichever that is";
+    paperOf(dialog)->setCurrentText(QStringLiteral("A6"));
+    EXPECT_EQ(dialog.setup().sheet, QSize(298, 420));
+    setup = dialog.setup();
+    EXPECT_EQ(paperOf(PageSetupDialog(setup))->currentText(), QStringLiteral("A6")) << "there again";
+    dialog.findChild<QComboBox *>()->setCurrentText(QStringLiteral("Large"));
+    EXPECT_EQ(paperOf(dialog)->currentText(), QStringLiteral("A3")) << "it has no A6: its own takes the place";
+    EXPECT_TRUE(dialog.setup().sheet.isEmpty());
+
+    PageSetup unknown;
+    EXPECT_TRUE(PageSetupDialog(unknown).setup().sheet.isEmpty()) << "nothing is known of the printer";
 }
 
 TEST(PageSetupDialog, ShowsMillimetresAndKeepsHundredths)

@@ -6,1098 +6,1108 @@
     <message>
         <location filename="../host/app/StandardText.cpp"/>
         <source>All Files (*.*)</source>
-        <translation type="unfinished"></translation>
+        <translation>Alle Dateien (*.*)</translation>
     </message>
     <message>
         <location filename="../host/app/StandardText.cpp"/>
         <source>The file is too large to open.</source>
-        <translation type="unfinished"></translation>
+        <translation>Die Datei ist zu groß und kann nicht geöffnet werden.</translation>
     </message>
     <message>
         <location filename="../host/frame/UDocument.cpp"/>
         <source>Save changes to %1?</source>
-        <translation type="unfinished"></translation>
+        <translation>Änderungen an %1 speichern?</translation>
     </message>
     <message>
         <location filename="../host/frame/UDocument.cpp"/>
         <source>Untitled</source>
-        <translation type="unfinished"></translation>
+        <translation>Unbenannt</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>an empty %1 ends its list: what follows in the list is not read</source>
-        <translation type="unfinished"></translation>
+        <translation>ein leeres %1 beendet seine Liste: was in der Liste folgt, wird nicht gelesen</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>%1 is not read: a closing tag of that name stands before it</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 wird nicht gelesen: davor steht ein schließendes Tag dieses Namens</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>%1 is not read: its closing tag was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 wird nicht gelesen: das schließende Tag dazu wurde erwartet</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>%1 stands in another %1: the outer one is cut short at the first closing tag</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 steht in einem anderen %1: das äußere endet schon beim ersten schließenden Tag</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>"%1" is dropped with the short closing tag of %2</source>
-        <translation type="unfinished"></translation>
+        <translation>„%1“ entfällt mit dem verkürzten schließenden Tag von %2</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>no template was read: a &lt;ReportTemplate&gt; element was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>es wurde keine Vorlage gelesen: ein Element &lt;ReportTemplate&gt; wurde erwartet</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>%1 is read although it stands in a comment</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 wird gelesen, obwohl es in einem Kommentar steht</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>%1 is no tag: a tag has no blanks and no attributes</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 ist kein Tag: ein Tag hat weder Leerzeichen noch Attribute</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the template has no &lt;Name&gt;, so nobody can choose it</source>
-        <translation type="unfinished"></translation>
+        <translation>die Vorlage hat keinen &lt;Name&gt; und kann daher nicht gewählt werden</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>a template named %1 stands before: the last one of a name is read</source>
-        <translation type="unfinished"></translation>
+        <translation>eine Vorlage namens %1 steht schon davor: von gleichnamigen wird die letzte gelesen</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the template's own &lt;Name&gt; must stand before %1: this one was taken for it</source>
-        <translation type="unfinished"></translation>
+        <translation>der eigene &lt;Name&gt; der Vorlage muss vor %1 stehen: dieser hier wurde dafür gehalten</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the sort key %1 is not in the dictionary %2</source>
-        <translation type="unfinished"></translation>
+        <translation>der Sortierschlüssel %1 steht nicht im Wörterbuch %2</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>no &lt;Separator&gt;: the character 0 stands between the columns</source>
-        <translation type="unfinished"></translation>
+        <translation>kein &lt;Separator&gt;: zwischen den Spalten steht das Zeichen mit dem Code 0</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the dictionary has no &lt;DictionaryName&gt;</source>
-        <translation type="unfinished"></translation>
+        <translation>das Wörterbuch hat keinen &lt;DictionaryName&gt;</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>unknown type %1: the variable %2 is left out</source>
-        <translation type="unfinished"></translation>
+        <translation>unbekannter Typ %1: die Variable %2 wird ausgelassen</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the identifier %1 counts as %2: a whole number was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>die Kennung %1 gilt als %2: eine ganze Zahl wurde erwartet</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the variable %1 stands twice in the dictionary: the last one counts</source>
-        <translation type="unfinished"></translation>
+        <translation>die Variable %1 steht zweimal im Wörterbuch: die letzte gilt</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the variables %1 and %2 share the identifier %3</source>
-        <translation type="unfinished"></translation>
+        <translation>die Variablen %1 und %2 haben dieselbe Kennung %3</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the table has no &lt;Name&gt;</source>
-        <translation type="unfinished"></translation>
+        <translation>die Tabelle hat keinen &lt;Name&gt;</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the block has no &lt;Name&gt;</source>
-        <translation type="unfinished"></translation>
+        <translation>der Block hat keinen &lt;Name&gt;</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>there is no dictionary named %1: %2 cannot be written</source>
-        <translation type="unfinished"></translation>
+        <translation>es gibt kein Wörterbuch namens %1: %2 kann nicht geschrieben werden</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>%1 has no fields</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 hat keine Felder</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the dictionary has no variable %1: the column cannot be filled</source>
-        <translation type="unfinished"></translation>
+        <translation>das Wörterbuch hat keine Variable %1: die Spalte kann nicht gefüllt werden</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the dictionary has no variable %1: the line repeats the value before it</source>
-        <translation type="unfinished"></translation>
+        <translation>das Wörterbuch hat keine Variable %1: die Zeile wiederholt den Wert davor</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the format %1 is beyond %2 characters</source>
-        <translation type="unfinished"></translation>
+        <translation>das Format %1 geht über %2 Zeichen hinaus</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the label %1 is wider than its column of %2: the column takes its width</source>
-        <translation type="unfinished"></translation>
+        <translation>die Beschriftung %1 ist breiter als ihre Spalte mit %2 Zeichen: die Spalte wird so breit wie die Beschriftung</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the alignment %1 counts as LEFT</source>
-        <translation type="unfinished"></translation>
+        <translation>die Ausrichtung %1 gilt als LEFT</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>%1 is printed as it stands</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 wird unverändert gedruckt</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>the page has not been measured</source>
-        <translation type="unfinished"></translation>
+        <translation>die Seite wurde noch nicht ausgemessen</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>a font size of 1 point or more was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>eine Schriftgröße von mindestens 1 Punkt wurde erwartet</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>the margins leave no room on the page: smaller margins were expected</source>
-        <translation type="unfinished"></translation>
+        <translation>die Ränder lassen auf der Seite keinen Platz: kleinere Ränder wurden erwartet</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>the PDF library failed with error %1</source>
-        <translation type="unfinished"></translation>
+        <translation>die PDF-Bibliothek meldet den Fehler %1</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>no fixed-pitch font was found: DejaVu Sans Mono, Liberation Mono or Hack was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>keine dicktengleiche Schrift wurde gefunden: DejaVu Sans Mono, Liberation Mono oder Hack wurde erwartet</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>the font file "%1" cannot be used</source>
-        <translation type="unfinished"></translation>
+        <translation>die Schriftdatei „%1“ kann nicht verwendet werden</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>stopped</source>
-        <translation type="unfinished"></translation>
+        <translation>abgebrochen</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>the lines %1 to %2 of the report become %3 when they are broken: they do not fit one page</source>
-        <translation type="unfinished"></translation>
+        <translation>die Zeilen %1 bis %2 des Berichts ergeben umbrochen %3 Zeilen: sie passen nicht auf eine Seite</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>no font has the character "%1" (U+%2), first in line %3, %4 times in all</source>
-        <translation type="unfinished"></translation>
+        <translation>keine Schrift enthält das Zeichen „%1“ (U+%2), zuerst in Zeile %3, insgesamt %4-mal</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>no font has %1 other characters, %2 times in all</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 weitere Zeichen sind in keiner Schrift enthalten, insgesamt %2-mal</translation>
     </message>
     <message>
         <location filename="../output/RichTextParser.cpp"/>
         <source>%1 bytes of data were expected behind \bin</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 Byte Daten wurden hinter \bin erwartet</translation>
     </message>
     <message>
         <location filename="../output/RichTextParser.cpp"/>
         <source>a closing brace was expected: groups that are still open: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>eine schließende geschweifte Klammer wurde erwartet: noch offene Gruppen: %1</translation>
     </message>
     <message>
         <location filename="../output/RichTextParser.cpp"/>
         <source>at most %1 groups inside each other were expected</source>
-        <translation type="unfinished"></translation>
+        <translation>höchstens %1 ineinander geschachtelte Gruppen wurden erwartet</translation>
     </message>
     <message>
         <location filename="../output/RichTextReader.cpp"/>
         <source>%1 was expected, with which a rich text begins</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 wurde erwartet, womit Rich-Text beginnt</translation>
     </message>
     <message>
         <location filename="../output/RichTextReader.cpp"/>
         <source>Pictures are not shown: %1.</source>
-        <translation type="unfinished"></translation>
+        <translation>Bilder werden nicht angezeigt: %1.</translation>
     </message>
     <message>
         <location filename="../output/RichTextReader.cpp"/>
         <source>Embedded objects and drawings are not shown: %1.</source>
-        <translation type="unfinished"></translation>
+        <translation>Eingebettete Objekte und Zeichnungen werden nicht angezeigt: %1.</translation>
     </message>
     <message>
         <location filename="../output/RichTextReader.cpp"/>
         <source>Footnotes and comments are not shown: %1.</source>
-        <translation type="unfinished"></translation>
+        <translation>Fußnoten und Kommentare werden nicht angezeigt: %1.</translation>
     </message>
     <message>
         <location filename="../output/RichTextReader.cpp"/>
         <source>Page headers and footers are not shown: %1.</source>
-        <translation type="unfinished"></translation>
+        <translation>Kopf- und Fußzeilen werden nicht angezeigt: %1.</translation>
     </message>
     <message>
         <location filename="../report/UReportDoc.cpp"/>
         <source>Station</source>
-        <translation type="unfinished"></translation>
+        <translation>Station</translation>
     </message>
     <message>
         <location filename="../report/UReportDoc.cpp"/>
         <source>   Page:</source>
         <comment>Report Header</comment>
-        <translation type="unfinished"></translation>
+        <translation>   Seite:</translation>
     </message>
     <message>
         <location filename="../report/UReportDocFile.cpp"/>
         <source>RTF Files (*.rtf)|*.rtf|Report Files (*.rep)|*.rep|PDF (*.pdf)|*.pdf|</source>
-        <translation type="unfinished"></translation>
+        <translation>RTF-Dateien (*.rtf)|*.rtf|Berichtsdateien (*.rep)|*.rep|PDF (*.pdf)|*.pdf|</translation>
     </message>
     <message>
         <location filename="../report/UReportDocFile.cpp"/>
         <source>Report Files (*.rep)|*.rep|RTF Files (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|</source>
-        <translation type="unfinished"></translation>
+        <translation>Berichtsdateien (*.rep)|*.rep|RTF-Dateien (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>Previous match</source>
-        <translation type="unfinished"></translation>
+        <translation>Vorherige Fundstelle</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>Next match</source>
-        <translation type="unfinished"></translation>
+        <translation>Nächste Fundstelle</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>Match &amp;case</source>
-        <translation type="unfinished"></translation>
+        <translation>Groß-/&amp;Kleinschreibung</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>&amp;Whole word</source>
-        <translation type="unfinished"></translation>
+        <translation>Nur ganze &amp;Wörter</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>Close the find bar</source>
-        <translation type="unfinished"></translation>
+        <translation>Suchleiste schließen</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>Find</source>
-        <translation type="unfinished"></translation>
+        <translation>Suchen</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>Text to find</source>
-        <translation type="unfinished"></translation>
+        <translation>Suchtext</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>Matches</source>
-        <translation type="unfinished"></translation>
+        <translation>Fundstellen</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>No match</source>
-        <translation type="unfinished"></translation>
+        <translation>Keine Fundstelle</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>%1 of %2</source>
         <comment>number of a match, number of all matches</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1 von %2</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>%1 in all</source>
         <comment>number of all matches</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1 insgesamt</translation>
     </message>
     <message>
         <location filename="../view/PageBar.cpp"/>
         <source>Go to page</source>
-        <translation type="unfinished"></translation>
+        <translation>Gehe zu Seite</translation>
     </message>
     <message>
         <location filename="../view/PageBar.cpp"/>
         <source>Page to go to</source>
-        <translation type="unfinished"></translation>
+        <translation>Zielseite</translation>
     </message>
     <message>
         <location filename="../view/PageBar.cpp"/>
         <source>Pages</source>
-        <translation type="unfinished"></translation>
+        <translation>Seiten</translation>
     </message>
     <message>
         <location filename="../view/PageBar.cpp"/>
         <source>&amp;Go to page</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Gehe zu Seite</translation>
     </message>
     <message>
         <location filename="../view/PageBar.cpp"/>
         <source>G&amp;o</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Los</translation>
     </message>
     <message>
         <location filename="../view/PageBar.cpp"/>
         <source>of %1</source>
         <comment>number of pages</comment>
-        <translation type="unfinished"></translation>
+        <translation>von %1</translation>
     </message>
     <message>
         <location filename="../view/PageSetupDialog.cpp"/>
         <source>Page Setup</source>
-        <translation type="unfinished"></translation>
+        <translation>Seite einrichten</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>P&amp;ortrait</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Hochformat</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>L&amp;andscape</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Querformat</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>&amp;Printer:</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Drucker:</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>Printer</source>
-        <translation type="unfinished"></translation>
+        <translation>Drucker</translation>
+    </message>
+    <message>
+        <location filename="../view/PageSetupForm.cpp"/>
+        <source>Pap&amp;er:</source>
+        <translation>Pa&amp;pier:</translation>
+    </message>
+    <message>
+        <location filename="../view/PageSetupForm.cpp"/>
+        <source>Paper</source>
+        <translation>Papier</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>Orientation</source>
-        <translation type="unfinished"></translation>
+        <translation>Ausrichtung</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>Margins</source>
-        <translation type="unfinished"></translation>
+        <translation>Seitenränder</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>&amp;Left:</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Links:</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>&amp;Top:</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Oben:</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>&amp;Right:</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Rechts:</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>&amp;Bottom:</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Unten:</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>Left margin</source>
-        <translation type="unfinished"></translation>
+        <translation>Linker Rand</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>Top margin</source>
-        <translation type="unfinished"></translation>
+        <translation>Oberer Rand</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>Right margin</source>
-        <translation type="unfinished"></translation>
+        <translation>Rechter Rand</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>Bottom margin</source>
-        <translation type="unfinished"></translation>
+        <translation>Unterer Rand</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source> mm</source>
-        <translation type="unfinished"></translation>
+        <translation> mm</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>Paper: %1 x %2 mm</source>
-        <translation type="unfinished"></translation>
+        <translation>Papier: %1 x %2 mm</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>These margins leave no room for text on the paper. Choose smaller margins.</source>
-        <translation type="unfinished"></translation>
+        <translation>Diese Ränder lassen auf dem Papier keinen Platz für Text. Bitte kleinere Ränder wählen.</translation>
     </message>
     <message>
         <location filename="../view/PrintDialogs.cpp"/>
         <source>Print</source>
-        <translation type="unfinished"></translation>
+        <translation>Drucken</translation>
     </message>
     <message>
         <location filename="../view/PrintDialogs.cpp"/>
         <source>Print Preview</source>
-        <translation type="unfinished"></translation>
+        <translation>Druckvorschau</translation>
     </message>
     <message>
         <location filename="../view/PrintProgress.cpp"/>
         <source>Printing</source>
-        <translation type="unfinished"></translation>
+        <translation>Drucken</translation>
     </message>
     <message>
         <location filename="../view/PrintProgress.cpp"/>
         <source>Cancel</source>
-        <translation type="unfinished"></translation>
+        <translation>Abbrechen</translation>
     </message>
     <message>
         <location filename="../view/PrintProgress.cpp"/>
         <source>Page %1 of %2</source>
-        <translation type="unfinished"></translation>
+        <translation>Seite %1 von %2</translation>
     </message>
     <message>
         <location filename="../view/PrintTarget.cpp"/>
         <source>There is no room left for the pages.</source>
-        <translation type="unfinished"></translation>
+        <translation>Für die Seiten ist kein Speicherplatz mehr frei.</translation>
     </message>
     <message>
         <location filename="../view/ReportEdit.cpp"/>
         <source>Report text</source>
-        <translation type="unfinished"></translation>
+        <translation>Berichtstext</translation>
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
         <source>Page</source>
-        <translation type="unfinished"></translation>
+        <translation>Seite</translation>
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
         <source>Line</source>
-        <translation type="unfinished"></translation>
+        <translation>Zeile</translation>
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
         <source>Line %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Zeile %1</translation>
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
         <source>Column</source>
-        <translation type="unfinished"></translation>
+        <translation>Spalte</translation>
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
         <source>Column %1</source>
-        <translation type="unfinished"></translation>
+        <translation>Spalte %1</translation>
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
         <source>Zoom</source>
-        <translation type="unfinished"></translation>
+        <translation>Zoom</translation>
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
         <source>%1 %</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 %</translation>
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
         <source>%1 %</source>
         <comment>zoom in percent</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1 %</translation>
     </message>
     <message>
         <location filename="../view/UReportViewPrint.cpp"/>
         <source>The margins leave no room for text on the paper. Choose smaller margins under Page Setup.</source>
-        <translation type="unfinished"></translation>
+        <translation>Die Ränder lassen auf dem Papier keinen Platz für Text. Bitte unter „Seite einrichten“ kleinere Ränder wählen.</translation>
     </message>
     <message>
         <location filename="../view/UReportViewPrint.cpp"/>
         <source>There is nothing to print on the chosen pages.</source>
-        <translation type="unfinished"></translation>
+        <translation>Auf den gewählten Seiten gibt es nichts zu drucken.</translation>
     </message>
     <message>
         <location filename="../view/UReportViewPrint.cpp"/>
         <source>The report has changed while it was printed, and nothing of it was sent to the printer. Print it again.</source>
-        <translation type="unfinished"></translation>
+        <translation>Der Bericht wurde während des Druckens geändert; es wurde nichts an den Drucker gesendet. Bitte erneut drucken.</translation>
     </message>
     <message>
         <location filename="../view/UReportViewPrint.cpp"/>
         <source>The report could not be printed on "%1". Check the printer, or choose another one, and print again. Nothing of the report is lost.</source>
-        <translation type="unfinished"></translation>
+        <translation>Der Bericht konnte auf „%1“ nicht gedruckt werden. Bitte den Drucker prüfen oder einen anderen wählen und erneut drucken. Vom Bericht ist nichts verloren gegangen.</translation>
     </message>
     <message>
         <location filename="../view/UReportViewPrint.cpp"/>
         <source>The preview shows the first %1 pages. All pages are printed.</source>
-        <translation type="unfinished"></translation>
+        <translation>Die Vorschau zeigt die ersten %1 Seiten. Gedruckt werden alle Seiten.</translation>
     </message>
     <message>
         <location filename="../view/UReportViewPrint.cpp"/>
         <source>Failed to get default printer settings.</source>
-        <translation type="unfinished"></translation>
+        <translation>Die Einstellungen des Standarddruckers konnten nicht abgerufen werden.</translation>
     </message>
     <message>
         <location filename="../ui/CReportToolBar.cpp"/>
         <source>Report</source>
-        <translation type="unfinished"></translation>
+        <translation>Bericht</translation>
     </message>
     <message>
         <location filename="../ui/CReportViewPane.cpp"/>
         <source>The Report can only be closed when the associated editor is closed</source>
-        <translation type="unfinished"></translation>
+        <translation>Der Bericht kann erst geschlossen werden, wenn der zugehörige Editor geschlossen ist</translation>
     </message>
     <message>
         <location filename="../ui/CReportViewPane.cpp"/>
         <source>Error</source>
         <comment>Alert Message title</comment>
-        <translation type="unfinished"></translation>
+        <translation>Fehler</translation>
     </message>
     <message>
         <location filename="../ui/ReportResources.cpp"/>
         <source>KaReport</source>
-        <translation type="unfinished"></translation>
+        <translation>KaReport</translation>
     </message>
     <message>
         <location filename="../ui/ReportResources.cpp"/>
         <source>Save</source>
-        <translation type="unfinished"></translation>
+        <translation>Speichern</translation>
     </message>
     <message>
         <location filename="../ui/ReportResources.cpp"/>
         <source>View\Edit Report</source>
-        <translation type="unfinished"></translation>
+        <translation>Bericht anzeigen/bearbeiten</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CommandSetup.cpp"/>
         <source>--as: one of %1 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>--as: einer dieser Werte wurde erwartet: %1</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CommandSetup.cpp"/>
         <source>the ending of "%1" says no kind: --as with one of %2 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>die Endung von „%1“ nennt keine Art: --as mit einem dieser Werte wurde erwartet: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CommandSetup.cpp"/>
         <source>--set "%1": KEY=VALUE was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>--set "%1": KEY=VALUE wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>a saved report was expected; this is a PDF</source>
-        <translation type="unfinished"></translation>
+        <translation>ein gespeicherter Bericht wurde erwartet; dies ist eine PDF-Datei</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>a report file was expected; this is no UTF-8</source>
-        <translation type="unfinished"></translation>
+        <translation>eine Berichtsdatei wurde erwartet; dies ist kein UTF-8-Text</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>--set "%1": a key of the page was expected, as page.linesPerPage=60</source>
-        <translation type="unfinished"></translation>
+        <translation>--set "%1": ein Schlüssel der Seite wurde erwartet, etwa page.linesPerPage=60</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>--set: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>--set: %1</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>kareport: warning: "%1": %2</source>
-        <translation type="unfinished"></translation>
+        <translation>kareport: Warnung: „%1“: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvObjectList.cpp"/>
         <source>a header row of variable names was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>eine Kopfzeile mit Variablennamen wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvObjectList.cpp"/>
         <source>the column "%1" stands twice: each variable was expected once</source>
-        <translation type="unfinished"></translation>
+        <translation>die Spalte „%1“ kommt zweimal vor: jede Variable wurde nur einmal erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvObjectList.cpp"/>
         <source>no column of the header row is a variable of the dictionary: a header row of variable names, with the data's delimiter between them, was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>keine Spalte der Kopfzeile ist eine Variable des Wörterbuchs: eine Kopfzeile mit Variablennamen, dazwischen das Trennzeichen der Daten, wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvObjectList.cpp"/>
         <source>the row has %1 cells: %2 were expected, as in the header row</source>
-        <translation type="unfinished"></translation>
+        <translation>die Zeile hat %1 Zellen: wie in der Kopfzeile wurden %2 erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvObjectList.cpp"/>
         <source>the cell "%1" of the column "%2" does not fit: %3 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>die Zelle „%1“ der Spalte „%2“ passt nicht: %3 wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvReader.cpp"/>
         <source>the file is not UTF-8</source>
-        <translation type="unfinished"></translation>
+        <translation>die Datei ist nicht in UTF-8 kodiert</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvReader.cpp"/>
         <source>a delimiter was expected behind the closing quote</source>
-        <translation type="unfinished"></translation>
+        <translation>hinter dem schließenden Anführungszeichen wurde ein Trennzeichen erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvReader.cpp"/>
         <source>a quote inside a cell was not expected: the whole cell must stand in quotes and the quote be doubled</source>
-        <translation type="unfinished"></translation>
+        <translation>ein Anführungszeichen in einer Zelle wurde nicht erwartet: die ganze Zelle muss in Anführungszeichen stehen und das Zeichen selbst doppelt</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvReader.cpp"/>
         <source>a zero byte stands in the file: a text file was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>die Datei enthält ein Nullbyte: eine Textdatei wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvReader.cpp"/>
         <source>the quoted cell has no closing quote</source>
-        <translation type="unfinished"></translation>
+        <translation>der Zelle in Anführungszeichen fehlt das schließende Anführungszeichen</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvReader.cpp"/>
         <source>a carriage return without a line feed was not expected</source>
-        <translation type="unfinished"></translation>
+        <translation>ein Wagenrücklauf (CR) ohne Zeilenvorschub (LF) wurde nicht erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvReader.cpp"/>
         <source>the row is longer than %1 bytes: a table of rows was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>die Zeile ist länger als %1 Byte: eine Tabelle aus Zeilen wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/FileBytes.cpp"/>
         <source>more than %1 MB come out of what is no file</source>
-        <translation type="unfinished"></translation>
+        <translation>mehr als %1 MB kommen aus einer Quelle, die keine Datei ist</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>one of %1 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>einer dieser Werte wurde erwartet: %1</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>a list of four margins (left, top, right, bottom) was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>eine Liste von vier Seitenrändern (links, oben, rechts, unten) wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>a character code or a text of one character was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>ein Zeichencode oder ein Text aus einem Zeichen wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>either "csv" or "values" was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>entweder "csv" oder "values" wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>an object or a list of objects was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>ein Objekt oder eine Liste von Objekten wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>a text of one ASCII character that is neither a quote nor a line end was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>ein Text aus einem ASCII-Zeichen, das weder Anführungszeichen noch Zeilenende ist, wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>true was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>true wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>a step was expected: one of heading, line, lineFeed, newPage, block, table, clear</source>
-        <translation type="unfinished"></translation>
+        <translation>ein Schritt wurde erwartet: einer von heading, line, lineFeed, newPage, block, table, clear</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>a "%1" needs a template: the key "template" was expected in the job</source>
-        <translation type="unfinished"></translation>
+        <translation>"%1" benötigt eine Vorlage: im Auftrag wurde der Schlüssel "template" erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>the key "data" with the name of a data set was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>der Schlüssel "data" mit dem Namen eines Datenbestands wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>there is no data set named "%1" in the job</source>
-        <translation type="unfinished"></translation>
+        <translation>im Auftrag gibt es keinen Datenbestand namens „%1“</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>the key "report" with a list of steps was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>der Schlüssel "report" mit einer Liste von Schritten wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>the key "file" was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>der Schlüssel "file" wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>the ending of "%1" says no kind: the key "as" with one of %2 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>die Endung von „%1“ nennt keine Art: der Schlüssel "as" mit einem dieser Werte wurde erwartet: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>a text that begins with "%1" was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>ein Text, der mit „%1“ beginnt, wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>a date and time such as 2024-03-05T14:07:00 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>Datum und Uhrzeit in der Form 2024-03-05T14:07:00 wurden erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>the key "%1" with a text was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>der Schlüssel "%1" mit einem Text wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>block</source>
-        <translation type="unfinished"></translation>
+        <translation>Block</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>table</source>
-        <translation type="unfinished"></translation>
+        <translation>Tabelle</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>the template has no %1 named "%2": one of %3 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 „%2“ fehlt in der Vorlage; vorhanden: %3</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>none</source>
-        <translation type="unfinished"></translation>
+        <translation>keine</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>the %1 "%2" cannot be written: the template has no dictionary named "%3"</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 „%2“ kann nicht geschrieben werden: die Vorlage hat kein Wörterbuch namens „%3“</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>the %1 "%2" cannot be written: the format of its field "%3" is beyond %4 characters</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 „%2“ kann nicht geschrieben werden: das Format des Felds „%3“ geht über %4 Zeichen hinaus</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>the data file "%1" cannot be read: %2</source>
-        <translation type="unfinished"></translation>
+        <translation>die Datendatei „%1“ kann nicht gelesen werden: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>Reading %1</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 wird gelesen</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>the data "%1" has no row: a block shows the first one</source>
-        <translation type="unfinished"></translation>
+        <translation>der Datenbestand „%1“ hat keine Zeile: ein Block zeigt die erste</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>a row was expected behind the header row: a block shows the first one</source>
-        <translation type="unfinished"></translation>
+        <translation>hinter der Kopfzeile wurde eine Zeile erwartet: ein Block zeigt die erste</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>the report could not be made</source>
-        <translation type="unfinished"></translation>
+        <translation>der Bericht konnte nicht erstellt werden</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>the margins leave no room on the page: smaller margins or a smaller font were expected</source>
-        <translation type="unfinished"></translation>
+        <translation>die Ränder lassen auf der Seite keinen Platz: kleinere Ränder oder eine kleinere Schrift wurden erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>there is no template file "%1"</source>
-        <translation type="unfinished"></translation>
+        <translation>es gibt keine Vorlagendatei „%1“</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobSettingsReader.cpp"/>
         <source>a list of three texts was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>eine Liste von drei Texten wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobSettingsReader.cpp"/>
         <source>one character with a code up to 255, or an empty text, was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>ein Zeichen mit einem Code bis 255 oder ein leerer Text wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>the file cannot be read: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>die Datei kann nicht gelesen werden: %1</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>the file is larger than %1 MB: a job was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>die Datei ist größer als %1 MB: ein Auftrag wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>a JSON object was expected: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>ein JSON-Objekt wurde erwartet: %1</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>a JSON object was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>ein JSON-Objekt wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>there is no place for the key "%1" in the job</source>
-        <translation type="unfinished"></translation>
+        <translation>für den Schlüssel "%1" ist im Auftrag kein Platz</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>a text was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>ein Text wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>true or false was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>true oder false wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>a whole number from %1 to %2 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>eine ganze Zahl von %1 bis %2 wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>an object was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>ein Objekt wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>a list was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>eine Liste wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>unknown key "%1": %2 expected</source>
-        <translation type="unfinished"></translation>
+        <translation>unbekannter Schlüssel "%1": erwartet: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonObjectList.cpp"/>
         <source>the variable "%1" stands twice: each variable was expected once</source>
-        <translation type="unfinished"></translation>
+        <translation>die Variable „%1“ kommt zweimal vor: jede Variable wurde nur einmal erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonObjectList.cpp"/>
         <source>the value of "%1" does not fit: %2 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>der Wert von „%1“ passt nicht: %2 wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputWriter.cpp"/>
         <source>the report could not be written to standard output: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>der Bericht konnte nicht in die Standardausgabe geschrieben werden: %1</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputWriter.cpp"/>
         <source>"%1" could not be written: %2</source>
-        <translation type="unfinished"></translation>
+        <translation>„%1“ konnte nicht geschrieben werden: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputWriter.cpp"/>
         <source>the report begins as rich text, but %1 (line %2, column %3)</source>
-        <translation type="unfinished"></translation>
+        <translation>der Bericht beginnt als Rich-Text, aber %1 (Zeile %2, Spalte %3)</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputsWriter.cpp"/>
         <source>kareport: stopped before "%1" was written</source>
-        <translation type="unfinished"></translation>
+        <translation>kareport: abgebrochen, bevor „%1“ geschrieben wurde</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputsWriter.cpp"/>
         <source>Writing %1</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 wird geschrieben</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputsWriter.cpp"/>
         <source>kareport: the report is empty: "%1" was not written</source>
-        <translation type="unfinished"></translation>
+        <translation>kareport: der Bericht ist leer: „%1“ wurde nicht geschrieben</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
         <source>either a job file or --template, --name, --table or --block, and --data were expected</source>
-        <translation type="unfinished"></translation>
+        <translation>entweder eine Auftragsdatei wurde erwartet oder --template, --name, --table bzw. --block sowie --data</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
         <source>--template, --name, --data and one of --table and --block were expected</source>
-        <translation type="unfinished"></translation>
+        <translation>--template, --name, --data und entweder --table oder --block wurden erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
         <source>kareport: stopped; nothing was written</source>
-        <translation type="unfinished"></translation>
+        <translation>kareport: abgebrochen; es wurde nichts geschrieben</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RowBatches.cpp"/>
         <source>there is not enough memory for the data</source>
-        <translation type="unfinished"></translation>
+        <translation>der Arbeitsspeicher reicht für die Daten nicht aus</translation>
     </message>
     <message>
         <location filename="../apps/kareport/TemplateSource.cpp"/>
         <source>the template file cannot be read: there is no such file</source>
-        <translation type="unfinished"></translation>
+        <translation>die Vorlagendatei kann nicht gelesen werden: es gibt sie nicht</translation>
     </message>
     <message>
         <location filename="../apps/kareport/TemplateSource.cpp"/>
         <source>a template file was expected; this is a folder, a pipe or a device</source>
-        <translation type="unfinished"></translation>
+        <translation>eine Vorlagendatei wurde erwartet; dies ist ein Ordner, eine Pipe oder ein Gerät</translation>
     </message>
     <message>
         <location filename="../apps/kareport/TemplateSource.cpp"/>
         <source>the template file has %1 MB: at most %2 MB were expected</source>
-        <translation type="unfinished"></translation>
+        <translation>die Vorlagendatei hat %1 MB: höchstens %2 MB wurden erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/TemplateSource.cpp"/>
         <source>the template file cannot be read</source>
-        <translation type="unfinished"></translation>
+        <translation>die Vorlagendatei kann nicht gelesen werden</translation>
     </message>
     <message>
         <location filename="../apps/kareport/TemplateSource.cpp"/>
         <source>the template file is empty: a &lt;ReportTemplate&gt; element was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>die Vorlagendatei ist leer: ein Element &lt;ReportTemplate&gt; wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/TemplateSource.cpp"/>
         <source>the template "%1" cannot be loaded: %2</source>
-        <translation type="unfinished"></translation>
+        <translation>die Vorlage „%1“ kann nicht geladen werden: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/TemplateSource.cpp"/>
         <source>the file holds no template: a &lt;ReportTemplate&gt; element was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>die Datei enthält keine Vorlage: ein Element &lt;ReportTemplate&gt; wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/TemplateSource.cpp"/>
         <source>there is no template named "%1": one of %2 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>es gibt keine Vorlage namens „%1“; vorhanden: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ValueParser.cpp"/>
         <source>a whole number</source>
-        <translation type="unfinished"></translation>
+        <translation>eine ganze Zahl</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ValueParser.cpp"/>
         <source>a text</source>
-        <translation type="unfinished"></translation>
+        <translation>ein Text</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ValueParser.cpp"/>
         <source>yes or no</source>
-        <translation type="unfinished"></translation>
+        <translation>yes oder no</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ValueParser.cpp"/>
         <source>a station such as 12+345.678</source>
-        <translation type="unfinished"></translation>
+        <translation>eine Station wie 12+345.678</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ValueParser.cpp"/>
         <source>an angle such as 45-30-15</source>
-        <translation type="unfinished"></translation>
+        <translation>ein Winkel wie 45-30-15</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ValueParser.cpp"/>
         <source>a number</source>
-        <translation type="unfinished"></translation>
+        <translation>eine Zahl</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ViewCommand.cpp"/>
         <source>there is no file "%1"</source>
-        <translation type="unfinished"></translation>
+        <translation>es gibt keine Datei „%1“</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ViewCommand.cpp"/>
         <source>the program kareport-desk is not installed</source>
-        <translation type="unfinished"></translation>
+        <translation>das Programm kareport-desk ist nicht installiert</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ViewCommand.cpp"/>
         <source>there is no display to show a window on: DISPLAY or WAYLAND_DISPLAY was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>es gibt keine Anzeige für ein Fenster: DISPLAY oder WAYLAND_DISPLAY wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ViewCommand.cpp"/>
         <source>"%1" could not be started</source>
-        <translation type="unfinished"></translation>
+        <translation>„%1“ konnte nicht gestartet werden</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskDialogs.cpp"/>
         <source>Save As</source>
-        <translation type="unfinished"></translation>
+        <translation>Speichern unter</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>Open a job or a saved report, or drop it here.</source>
-        <translation type="unfinished"></translation>
+        <translation>Auftrag oder gespeicherten Bericht öffnen oder hierher ziehen.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>Open</source>
-        <translation type="unfinished"></translation>
+        <translation>Öffnen</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>Reports, jobs and templates (*.rep *.rtf *.json *.xml)</source>
-        <translation type="unfinished"></translation>
+        <translation>Berichte, Aufträge und Vorlagen (*.rep *.rtf *.json *.xml)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>All files (*)</source>
-        <translation type="unfinished"></translation>
+        <translation>Alle Dateien (*)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>There is no file "%1".</source>
-        <translation type="unfinished"></translation>
+        <translation>Es gibt keine Datei „%1“.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>"%1" could not be opened.</source>
-        <translation type="unfinished"></translation>
+        <translation>„%1“ konnte nicht geöffnet werden.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source> (with changes that were not saved)</source>
-        <translation type="unfinished"></translation>
+        <translation> (mit nicht gespeicherten Änderungen)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
@@ -1106,699 +1116,710 @@
 %1
 
 Open them again?</source>
-        <translation type="unfinished"></translation>
+        <translation>KaReport wurde beim letzten Mal nicht ordnungsgemäß beendet. Diese Berichte waren geöffnet:
+
+%1
+
+Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>"%1" was changed by another program, and it has changes here that are not saved. Load it again and lose the changes made here?</source>
-        <translation type="unfinished"></translation>
+        <translation>„%1“ wurde von einem anderen Programm geändert, und hier gibt es Änderungen, die nicht gespeichert sind. Neu laden und die hier gemachten Änderungen verwerfen?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>"%1" was changed by another program. Load it again?</source>
-        <translation type="unfinished"></translation>
+        <translation>„%1“ wurde von einem anderen Programm geändert. Neu laden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>About KaReport</source>
-        <translation type="unfinished"></translation>
+        <translation>Über KaReport</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>KaReport: fixed-pitch reports for civil engineering and surveying.
 
 Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and print it. Ctrl+F finds text, Ctrl+G goes to a page, Ctrl+wheel zooms.</source>
-        <translation type="unfinished"></translation>
+        <translation>KaReport: Berichte in dicktengleicher Schrift für Tiefbau und Vermessung.
+
+Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.rep, .rtf) kann gelesen, bearbeitet und gedruckt werden. Strg+F sucht Text, Strg+G springt zu einer Seite, Strg+Mausrad ändert die Ansichtsgröße.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;File</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Datei</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;New	Ctrl+N</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Neu	Ctrl+N</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>New from &amp;Template...	Ctrl+T</source>
-        <translation type="unfinished"></translation>
+        <translation>Neu aus &amp;Vorlage...	Ctrl+T</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Open...	Ctrl+O</source>
-        <translation type="unfinished"></translation>
+        <translation>Ö&amp;ffnen...	Ctrl+O</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Close	Ctrl+W</source>
-        <translation type="unfinished"></translation>
+        <translation>S&amp;chließen	Ctrl+W</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Save	Ctrl+S</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Speichern	Ctrl+S</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Save &amp;As...	Ctrl+Shift+S</source>
-        <translation type="unfinished"></translation>
+        <translation>Speichern &amp;unter...	Ctrl+Shift+S</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Update Text</source>
-        <translation type="unfinished"></translation>
+        <translation>Text aktualisieren</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Print...	Ctrl+P</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Drucken...	Ctrl+P</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Print Pre&amp;view</source>
-        <translation type="unfinished"></translation>
+        <translation>Druckv&amp;orschau</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Pa&amp;ge Setup...</source>
-        <translation type="unfinished"></translation>
+        <translation>Seite ein&amp;richten...</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Recent File</source>
-        <translation type="unfinished"></translation>
+        <translation>Zuletzt verwendete Dateien</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>E&amp;xit	Ctrl+Q</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Beenden	Ctrl+Q</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Edit</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Bearbeiten</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Undo	Ctrl+Z</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Rückgängig	Ctrl+Z</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Redo	Ctrl+Shift+Z</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Wiederholen	Ctrl+Shift+Z</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Cu&amp;t	Ctrl+X</source>
-        <translation type="unfinished"></translation>
+        <translation>A&amp;usschneiden	Ctrl+X</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Copy	Ctrl+C</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Kopieren	Ctrl+C</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Paste	Ctrl+V</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Einfügen	Ctrl+V</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Select &amp;All	Ctrl+A</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Alles auswählen	Ctrl+A</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Find...	Ctrl+F</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Suchen...	Ctrl+F</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Find &amp;Next	F3</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Nächste Fundstelle	F3</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Find Pre&amp;vious	Shift+F3</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Vorherige Fundstelle	Shift+F3</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Go to Page...	Ctrl+G</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Gehe zu Seite...	Ctrl+G</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Pr&amp;eferences...	Ctrl+,</source>
-        <translation type="unfinished"></translation>
+        <translation>E&amp;instellungen...	Ctrl+,</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;View</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Ansicht</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Toolbar</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Symbolleiste</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Status Bar</source>
-        <translation type="unfinished"></translation>
+        <translation>S&amp;tatusleiste</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Zoom &amp;In	Ctrl++</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Vergrößern	Ctrl++</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Zoom &amp;Out	Ctrl+-</source>
-        <translation type="unfinished"></translation>
+        <translation>Ver&amp;kleinern	Ctrl+-</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Usual Size	Ctrl+0</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Normale Größe	Ctrl+0</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Window</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Fenster</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;New Window</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Neues Fenster</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Cascade</source>
-        <translation type="unfinished"></translation>
+        <translation>Ü&amp;berlappend</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Tile Horizontally</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Untereinander</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Tile Vertically</source>
-        <translation type="unfinished"></translation>
+        <translation>Nebeneinander</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Arrange Icons</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Symbole anordnen</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Help</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Hilfe</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Help	F1</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Hilfe	F1</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;About...</source>
-        <translation type="unfinished"></translation>
+        <translation>Ü&amp;ber KaReport...</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Toolbar</source>
-        <translation type="unfinished"></translation>
+        <translation>Symbolleiste</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>&amp;Show reports in this program:</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Berichte in diesem Programm anzeigen:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>Bro&amp;wse...</source>
-        <translation type="unfinished"></translation>
+        <translation>D&amp;urchsuchen...</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/EditorPage.cpp"/>
+        <source>&amp;Keep a report open while the program is</source>
+        <translation>Bericht &amp;offen halten, solange das Programm geöffnet ist</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>Program that shows reports</source>
-        <translation type="unfinished"></translation>
+        <translation>Programm, das Berichte anzeigt</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>Choose a program, or clear the box above.</source>
-        <translation type="unfinished"></translation>
+        <translation>Bitte ein Programm wählen oder das Häkchen oben entfernen.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>There is no program "%1". Choose one from the list, or with Browse.</source>
-        <translation type="unfinished"></translation>
+        <translation>Es gibt kein Programm „%1“. Bitte eines aus der Liste oder mit „Durchsuchen“ wählen.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>Choose a program</source>
-        <translation type="unfinished"></translation>
+        <translation>Programm wählen</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>Reports are shown in their own window.</source>
-        <translation type="unfinished"></translation>
+        <translation>Berichte werden im eigenen Fenster angezeigt.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>It gets reports as rich text.</source>
-        <translation type="unfinished"></translation>
+        <translation>Es erhält Berichte als Rich-Text.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>It gets reports as plain text.</source>
-        <translation type="unfinished"></translation>
+        <translation>Es erhält Berichte als reinen Text.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
         <source>There is not enough memory for this input.</source>
-        <translation type="unfinished"></translation>
+        <translation>Der Arbeitsspeicher reicht für diese Eingabe nicht aus.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Preferences</source>
-        <translation type="unfinished"></translation>
+        <translation>Einstellungen</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source> pt</source>
-        <translation type="unfinished"></translation>
+        <translation> pt</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Font size</source>
-        <translation type="unfinished"></translation>
+        <translation>Schriftgröße</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>&amp;Font size of new reports:</source>
-        <translation type="unfinished"></translation>
+        <translation>Schri&amp;ftgröße neuer Berichte:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>As the system</source>
-        <translation type="unfinished"></translation>
+        <translation>Wie im System</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Language</source>
-        <translation type="unfinished"></translation>
+        <translation>Sprache</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>&amp;Language (from the next start):</source>
-        <translation type="unfinished"></translation>
+        <translation>S&amp;prache (ab dem nächsten Start):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>&amp;Units and Formats</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Einheiten und Formate</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>&amp;Page</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Seite</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>&amp;Editor</source>
-        <translation type="unfinished"></translation>
+        <translation>Ed&amp;itor</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>P&amp;rogram</source>
-        <translation type="unfinished"></translation>
+        <translation>Pro&amp;gramm</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Report from Template</source>
-        <translation type="unfinished"></translation>
+        <translation>Bericht aus Vorlage</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Choose a template file</source>
-        <translation type="unfinished"></translation>
+        <translation>Vorlagendatei wählen</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Brow&amp;se...</source>
-        <translation type="unfinished"></translation>
+        <translation>Dur&amp;chsuchen...</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Choose a data file</source>
-        <translation type="unfinished"></translation>
+        <translation>Datendatei wählen</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Template file</source>
-        <translation type="unfinished"></translation>
+        <translation>Vorlagendatei</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Template</source>
-        <translation type="unfinished"></translation>
+        <translation>Vorlage</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Table or block</source>
-        <translation type="unfinished"></translation>
+        <translation>Tabelle oder Block</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Data file</source>
-        <translation type="unfinished"></translation>
+        <translation>Datendatei</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>&amp;File:</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Datei:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>&amp;Template:</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Vorlage:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Table or &amp;block:</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Tabelle oder Block:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>&amp;Data (CSV):</source>
-        <translation type="unfinished"></translation>
+        <translation>Date&amp;n (CSV):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Templates (*.xml);;All files (*)</source>
-        <translation type="unfinished"></translation>
+        <translation>Vorlagen (*.xml);;Alle Dateien (*)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Data (*.csv *.txt);;All files (*)</source>
-        <translation type="unfinished"></translation>
+        <translation>Daten (*.csv *.txt);;Alle Dateien (*)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>This template has neither a table nor a block.</source>
-        <translation type="unfinished"></translation>
+        <translation>Diese Vorlage hat weder eine Tabelle noch einen Block.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>There is no data file "%1".</source>
-        <translation type="unfinished"></translation>
+        <translation>Es gibt keine Datendatei „%1“.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Metre</source>
-        <translation type="unfinished"></translation>
+        <translation>Meter</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Millimetre</source>
-        <translation type="unfinished"></translation>
+        <translation>Millimeter</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Kilometre</source>
-        <translation type="unfinished"></translation>
+        <translation>Kilometer</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>International foot</source>
-        <translation type="unfinished"></translation>
+        <translation>Internationaler Fuß</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>US survey foot</source>
-        <translation type="unfinished"></translation>
+        <translation>US-Vermessungsfuß</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Square metre</source>
-        <translation type="unfinished"></translation>
+        <translation>Quadratmeter</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Hectare</source>
-        <translation type="unfinished"></translation>
+        <translation>Hektar</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Square kilometre</source>
-        <translation type="unfinished"></translation>
+        <translation>Quadratkilometer</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Square foot</source>
-        <translation type="unfinished"></translation>
+        <translation>Quadratfuß</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Acre</source>
-        <translation type="unfinished"></translation>
+        <translation>Acre</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Degree</source>
-        <translation type="unfinished"></translation>
+        <translation>Grad</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Gon</source>
-        <translation type="unfinished"></translation>
+        <translation>Gon</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Radian</source>
-        <translation type="unfinished"></translation>
+        <translation>Radiant</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Easting, northing</source>
-        <translation type="unfinished"></translation>
+        <translation>Rechtswert (E), Hochwert (N)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Northing, easting</source>
-        <translation type="unfinished"></translation>
+        <translation>Hochwert (N), Rechtswert (E)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Degrees, minutes, seconds</source>
-        <translation type="unfinished"></translation>
+        <translation>Grad, Minuten, Sekunden</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Decimal degrees</source>
-        <translation type="unfinished"></translation>
+        <translation>Dezimalgrad</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Whole circle</source>
-        <translation type="unfinished"></translation>
+        <translation>Vollkreis</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Quadrant</source>
-        <translation type="unfinished"></translation>
+        <translation>Quadrant</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>From north</source>
-        <translation type="unfinished"></translation>
+        <translation>Von Norden</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>From south</source>
-        <translation type="unfinished"></translation>
+        <translation>Von Süden</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Leading &amp;zeros</source>
-        <translation type="unfinished"></translation>
+        <translation>Führende &amp;Nullen</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>&amp;Lengths:</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Längen:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Decimals:</source>
-        <translation type="unfinished"></translation>
+        <translation>Nachkommastellen:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>&amp;Areas:</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Flächen:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Decimals of numbers:</source>
-        <translation type="unfinished"></translation>
+        <translation>Nachkommastellen der Zahlen:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>A&amp;ngles:</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Winkel:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>&amp;Stations:</source>
-        <translation type="unfinished"></translation>
+        <translation>S&amp;tationen:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>&amp;Coordinates:</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Koordinaten:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>&amp;Bearings:</source>
-        <translation type="unfinished"></translation>
+        <translation>&amp;Richtungswinkel:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Degree mark</source>
-        <translation type="unfinished"></translation>
+        <translation>Gradzeichen</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Minute mark</source>
-        <translation type="unfinished"></translation>
+        <translation>Minutenzeichen</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Second mark</source>
-        <translation type="unfinished"></translation>
+        <translation>Sekundenzeichen</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Angle &amp;marks:</source>
-        <translation type="unfinished"></translation>
+        <translation>Winkel&amp;zeichen:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Looks like</source>
-        <translation type="unfinished"></translation>
+        <translation>Beispiel</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Unit of lengths</source>
-        <translation type="unfinished"></translation>
+        <translation>Längeneinheit</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Decimals of lengths</source>
-        <translation type="unfinished"></translation>
+        <translation>Nachkommastellen der Längen</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Unit of areas</source>
-        <translation type="unfinished"></translation>
+        <translation>Flächeneinheit</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Decimals of numbers and areas</source>
-        <translation type="unfinished"></translation>
+        <translation>Nachkommastellen der Zahlen und Flächen</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Unit of angles</source>
-        <translation type="unfinished"></translation>
+        <translation>Winkeleinheit</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Form of stations</source>
-        <translation type="unfinished"></translation>
+        <translation>Form der Stationen</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Decimals of stations</source>
-        <translation type="unfinished"></translation>
+        <translation>Nachkommastellen der Stationen</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Order of coordinates</source>
-        <translation type="unfinished"></translation>
+        <translation>Reihenfolge der Koordinaten</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Unit of bearings</source>
-        <translation type="unfinished"></translation>
+        <translation>Einheit der Richtungswinkel</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Decimals of bearings</source>
-        <translation type="unfinished"></translation>
+        <translation>Nachkommastellen der Richtungswinkel</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Style of bearings</source>
-        <translation type="unfinished"></translation>
+        <translation>Darstellung der Richtungswinkel</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Reference of bearings</source>
-        <translation type="unfinished"></translation>
+        <translation>Bezugsrichtung der Richtungswinkel</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Length</source>
-        <translation type="unfinished"></translation>
+        <translation>Länge</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Area</source>
-        <translation type="unfinished"></translation>
+        <translation>Fläche</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Angle</source>
-        <translation type="unfinished"></translation>
+        <translation>Winkel</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Bearing</source>
-        <translation type="unfinished"></translation>
+        <translation>Richtungswinkel</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Columns</source>
-        <translation type="unfinished"></translation>
+        <translation>Spalten</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>E, N</source>
-        <translation type="unfinished"></translation>
+        <translation>E, N</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>N, E</source>
-        <translation type="unfinished"></translation>
+        <translation>N, E</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/main.cpp"/>
         <source>Runs report jobs, and shows, edits and prints reports.</source>
-        <translation type="unfinished"></translation>
+        <translation>Führt Berichtsaufträge aus und zeigt, bearbeitet und druckt Berichte.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/main.cpp"/>
-        <source>Jobs (.json) and saved reports (.rep, .rtf) to open</source>
-        <translation type="unfinished"></translation>
+        <source>Jobs (.json), saved reports (.rep, .rtf) and templates (.xml) to open</source>
+        <translation>Zu öffnende Aufträge (.json), gespeicherte Berichte (.rep, .rtf) und Vorlagen (.xml)</translation>
     </message>
 </context>
 </TS>

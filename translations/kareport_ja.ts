@@ -6,1098 +6,1108 @@
     <message>
         <location filename="../host/app/StandardText.cpp"/>
         <source>All Files (*.*)</source>
-        <translation type="unfinished"></translation>
+        <translation>すべてのファイル (*.*)</translation>
     </message>
     <message>
         <location filename="../host/app/StandardText.cpp"/>
         <source>The file is too large to open.</source>
-        <translation type="unfinished"></translation>
+        <translation>ファイルが大きすぎて開けません。</translation>
     </message>
     <message>
         <location filename="../host/frame/UDocument.cpp"/>
         <source>Save changes to %1?</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 への変更を保存しますか?</translation>
     </message>
     <message>
         <location filename="../host/frame/UDocument.cpp"/>
         <source>Untitled</source>
-        <translation type="unfinished"></translation>
+        <translation>無題</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>an empty %1 ends its list: what follows in the list is not read</source>
-        <translation type="unfinished"></translation>
+        <translation>空の %1 でリストが終わります: リスト内のこれ以降は読み込まれません</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>%1 is not read: a closing tag of that name stands before it</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 は読み込まれません: 同じ名前の終了タグが前にあります</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>%1 is not read: its closing tag was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 は読み込まれません: 終了タグが必要です</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>%1 stands in another %1: the outer one is cut short at the first closing tag</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 が別の %1 の中にあります: 外側の要素は最初の終了タグで打ち切られます</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>"%1" is dropped with the short closing tag of %2</source>
-        <translation type="unfinished"></translation>
+        <translation>「%1」は %2 の省略形の終了タグとともに無視されます</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>no template was read: a &lt;ReportTemplate&gt; element was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートが読み込まれませんでした: &lt;ReportTemplate&gt; 要素が必要です</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>%1 is read although it stands in a comment</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 はコメント内にありますが、読み込まれます</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>%1 is no tag: a tag has no blanks and no attributes</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 はタグではありません: タグに空白や属性は使えません</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the template has no &lt;Name&gt;, so nobody can choose it</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートに &lt;Name&gt; がないため、選択できません</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>a template named %1 stands before: the last one of a name is read</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 という名前のテンプレートが前にもあります: 同名のものは最後の 1 つが読み込まれます</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the template's own &lt;Name&gt; must stand before %1: this one was taken for it</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレート自身の &lt;Name&gt; は %1 より前に必要です: この &lt;Name&gt; がテンプレート名とみなされました</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the sort key %1 is not in the dictionary %2</source>
-        <translation type="unfinished"></translation>
+        <translation>並べ替えキー %1 は辞書 %2 にありません</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>no &lt;Separator&gt;: the character 0 stands between the columns</source>
-        <translation type="unfinished"></translation>
+        <translation>&lt;Separator&gt; がありません: 列の間には文字コード 0 の文字が入ります</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the dictionary has no &lt;DictionaryName&gt;</source>
-        <translation type="unfinished"></translation>
+        <translation>辞書に &lt;DictionaryName&gt; がありません</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>unknown type %1: the variable %2 is left out</source>
-        <translation type="unfinished"></translation>
+        <translation>不明な型 %1: 変数 %2 は除外されます</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the identifier %1 counts as %2: a whole number was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>識別子 %1 は %2 とみなされます: 整数が必要です</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the variable %1 stands twice in the dictionary: the last one counts</source>
-        <translation type="unfinished"></translation>
+        <translation>変数 %1 が辞書に 2 回あります: 最後のものが有効です</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the variables %1 and %2 share the identifier %3</source>
-        <translation type="unfinished"></translation>
+        <translation>変数 %1 と %2 の識別子がどちらも %3 です</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the table has no &lt;Name&gt;</source>
-        <translation type="unfinished"></translation>
+        <translation>表に &lt;Name&gt; がありません</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the block has no &lt;Name&gt;</source>
-        <translation type="unfinished"></translation>
+        <translation>ブロックに &lt;Name&gt; がありません</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>there is no dictionary named %1: %2 cannot be written</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 という名前の辞書がありません: %2 は出力できません</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>%1 has no fields</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 にフィールドがありません</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the dictionary has no variable %1: the column cannot be filled</source>
-        <translation type="unfinished"></translation>
+        <translation>辞書に変数 %1 がありません: この列には値が入りません</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the dictionary has no variable %1: the line repeats the value before it</source>
-        <translation type="unfinished"></translation>
+        <translation>辞書に変数 %1 がありません: この行には直前の値が繰り返されます</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the format %1 is beyond %2 characters</source>
-        <translation type="unfinished"></translation>
+        <translation>書式 %1 が %2 文字を超えています</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the label %1 is wider than its column of %2: the column takes its width</source>
-        <translation type="unfinished"></translation>
+        <translation>ラベル %1 が列幅 %2 文字を超えています: 列幅はラベルに合わせられます</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>the alignment %1 counts as LEFT</source>
-        <translation type="unfinished"></translation>
+        <translation>配置 %1 は LEFT とみなされます</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
         <source>%1 is printed as it stands</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 はそのまま印字されます</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>the page has not been measured</source>
-        <translation type="unfinished"></translation>
+        <translation>ページの寸法がまだ求められていません</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>a font size of 1 point or more was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>フォントサイズは 1 ポイント以上が必要です</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>the margins leave no room on the page: smaller margins were expected</source>
-        <translation type="unfinished"></translation>
+        <translation>余白が大きく、ページに印字できる範囲がありません: 余白を小さくする必要があります</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>the PDF library failed with error %1</source>
-        <translation type="unfinished"></translation>
+        <translation>PDF ライブラリでエラー %1 が発生しました</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>no fixed-pitch font was found: DejaVu Sans Mono, Liberation Mono or Hack was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>等幅フォントが見つかりません: DejaVu Sans Mono、Liberation Mono、Hack のいずれかが必要です</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>the font file "%1" cannot be used</source>
-        <translation type="unfinished"></translation>
+        <translation>フォントファイル「%1」は使用できません</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>stopped</source>
-        <translation type="unfinished"></translation>
+        <translation>中断されました</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>the lines %1 to %2 of the report become %3 when they are broken: they do not fit one page</source>
-        <translation type="unfinished"></translation>
+        <translation>帳票の %1 行目から %2 行目までを折り返すと %3 行になり、1 ページに収まりません</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>no font has the character "%1" (U+%2), first in line %3, %4 times in all</source>
-        <translation type="unfinished"></translation>
+        <translation>文字「%1」(U+%2) を含むフォントがありません (最初は %3 行目、全 %4 回)</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
         <source>no font has %1 other characters, %2 times in all</source>
-        <translation type="unfinished"></translation>
+        <translation>ほかに %1 種類の文字を含むフォントがありません (全 %2 回)</translation>
     </message>
     <message>
         <location filename="../output/RichTextParser.cpp"/>
         <source>%1 bytes of data were expected behind \bin</source>
-        <translation type="unfinished"></translation>
+        <translation>\bin の後に %1 バイトのデータが必要です</translation>
     </message>
     <message>
         <location filename="../output/RichTextParser.cpp"/>
         <source>a closing brace was expected: groups that are still open: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>閉じ波かっこが必要です: 閉じていないグループの数: %1</translation>
     </message>
     <message>
         <location filename="../output/RichTextParser.cpp"/>
         <source>at most %1 groups inside each other were expected</source>
-        <translation type="unfinished"></translation>
+        <translation>グループの入れ子は %1 段以下である必要があります</translation>
     </message>
     <message>
         <location filename="../output/RichTextReader.cpp"/>
         <source>%1 was expected, with which a rich text begins</source>
-        <translation type="unfinished"></translation>
+        <translation>リッチテキストの先頭には %1 が必要です</translation>
     </message>
     <message>
         <location filename="../output/RichTextReader.cpp"/>
         <source>Pictures are not shown: %1.</source>
-        <translation type="unfinished"></translation>
+        <translation>画像は表示されません: %1 個。</translation>
     </message>
     <message>
         <location filename="../output/RichTextReader.cpp"/>
         <source>Embedded objects and drawings are not shown: %1.</source>
-        <translation type="unfinished"></translation>
+        <translation>埋め込みオブジェクトと図形は表示されません: %1 個。</translation>
     </message>
     <message>
         <location filename="../output/RichTextReader.cpp"/>
         <source>Footnotes and comments are not shown: %1.</source>
-        <translation type="unfinished"></translation>
+        <translation>脚注とコメントは表示されません: %1 個。</translation>
     </message>
     <message>
         <location filename="../output/RichTextReader.cpp"/>
         <source>Page headers and footers are not shown: %1.</source>
-        <translation type="unfinished"></translation>
+        <translation>ヘッダーとフッターは表示されません: %1 個。</translation>
     </message>
     <message>
         <location filename="../report/UReportDoc.cpp"/>
         <source>Station</source>
-        <translation type="unfinished"></translation>
+        <translation>測点No.</translation>
     </message>
     <message>
         <location filename="../report/UReportDoc.cpp"/>
         <source>   Page:</source>
         <comment>Report Header</comment>
-        <translation type="unfinished"></translation>
+        <translation>   頁:</translation>
     </message>
     <message>
         <location filename="../report/UReportDocFile.cpp"/>
         <source>RTF Files (*.rtf)|*.rtf|Report Files (*.rep)|*.rep|PDF (*.pdf)|*.pdf|</source>
-        <translation type="unfinished"></translation>
+        <translation>RTF ファイル (*.rtf)|*.rtf|帳票ファイル (*.rep)|*.rep|PDF (*.pdf)|*.pdf|</translation>
     </message>
     <message>
         <location filename="../report/UReportDocFile.cpp"/>
         <source>Report Files (*.rep)|*.rep|RTF Files (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|</source>
-        <translation type="unfinished"></translation>
+        <translation>帳票ファイル (*.rep)|*.rep|RTF ファイル (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>Previous match</source>
-        <translation type="unfinished"></translation>
+        <translation>前の一致箇所</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>Next match</source>
-        <translation type="unfinished"></translation>
+        <translation>次の一致箇所</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>Match &amp;case</source>
-        <translation type="unfinished"></translation>
+        <translation>大文字と小文字を区別(&amp;C)</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>&amp;Whole word</source>
-        <translation type="unfinished"></translation>
+        <translation>単語単位(&amp;D)</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>Close the find bar</source>
-        <translation type="unfinished"></translation>
+        <translation>検索バーを閉じる</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>Find</source>
-        <translation type="unfinished"></translation>
+        <translation>検索</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>Text to find</source>
-        <translation type="unfinished"></translation>
+        <translation>検索する文字列</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>Matches</source>
-        <translation type="unfinished"></translation>
+        <translation>一致箇所</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>No match</source>
-        <translation type="unfinished"></translation>
+        <translation>見つかりません</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>%1 of %2</source>
         <comment>number of a match, number of all matches</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1 / %2 件</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
         <source>%1 in all</source>
         <comment>number of all matches</comment>
-        <translation type="unfinished"></translation>
+        <translation>全 %1 件</translation>
     </message>
     <message>
         <location filename="../view/PageBar.cpp"/>
         <source>Go to page</source>
-        <translation type="unfinished"></translation>
+        <translation>ページへ移動</translation>
     </message>
     <message>
         <location filename="../view/PageBar.cpp"/>
         <source>Page to go to</source>
-        <translation type="unfinished"></translation>
+        <translation>移動先のページ</translation>
     </message>
     <message>
         <location filename="../view/PageBar.cpp"/>
         <source>Pages</source>
-        <translation type="unfinished"></translation>
+        <translation>ページ数</translation>
     </message>
     <message>
         <location filename="../view/PageBar.cpp"/>
         <source>&amp;Go to page</source>
-        <translation type="unfinished"></translation>
+        <translation>ページへ移動(&amp;G)</translation>
     </message>
     <message>
         <location filename="../view/PageBar.cpp"/>
         <source>G&amp;o</source>
-        <translation type="unfinished"></translation>
+        <translation>移動(&amp;O)</translation>
     </message>
     <message>
         <location filename="../view/PageBar.cpp"/>
         <source>of %1</source>
         <comment>number of pages</comment>
-        <translation type="unfinished"></translation>
+        <translation>/ %1 ページ</translation>
     </message>
     <message>
         <location filename="../view/PageSetupDialog.cpp"/>
         <source>Page Setup</source>
-        <translation type="unfinished"></translation>
+        <translation>ページ設定</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>P&amp;ortrait</source>
-        <translation type="unfinished"></translation>
+        <translation>縦(&amp;O)</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>L&amp;andscape</source>
-        <translation type="unfinished"></translation>
+        <translation>横(&amp;A)</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>&amp;Printer:</source>
-        <translation type="unfinished"></translation>
+        <translation>プリンター(&amp;P):</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>Printer</source>
-        <translation type="unfinished"></translation>
+        <translation>プリンター</translation>
+    </message>
+    <message>
+        <location filename="../view/PageSetupForm.cpp"/>
+        <source>Pap&amp;er:</source>
+        <translation>用紙(&amp;Z):</translation>
+    </message>
+    <message>
+        <location filename="../view/PageSetupForm.cpp"/>
+        <source>Paper</source>
+        <translation>用紙</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>Orientation</source>
-        <translation type="unfinished"></translation>
+        <translation>印刷の向き</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>Margins</source>
-        <translation type="unfinished"></translation>
+        <translation>余白</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>&amp;Left:</source>
-        <translation type="unfinished"></translation>
+        <translation>左(&amp;L):</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>&amp;Top:</source>
-        <translation type="unfinished"></translation>
+        <translation>上(&amp;T):</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>&amp;Right:</source>
-        <translation type="unfinished"></translation>
+        <translation>右(&amp;R):</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>&amp;Bottom:</source>
-        <translation type="unfinished"></translation>
+        <translation>下(&amp;B):</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>Left margin</source>
-        <translation type="unfinished"></translation>
+        <translation>左余白</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>Top margin</source>
-        <translation type="unfinished"></translation>
+        <translation>上余白</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>Right margin</source>
-        <translation type="unfinished"></translation>
+        <translation>右余白</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>Bottom margin</source>
-        <translation type="unfinished"></translation>
+        <translation>下余白</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source> mm</source>
-        <translation type="unfinished"></translation>
+        <translation> mm</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>Paper: %1 x %2 mm</source>
-        <translation type="unfinished"></translation>
+        <translation>用紙: %1 x %2 mm</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
         <source>These margins leave no room for text on the paper. Choose smaller margins.</source>
-        <translation type="unfinished"></translation>
+        <translation>余白が大きく、用紙に印字できる範囲がありません。余白を小さくしてください。</translation>
     </message>
     <message>
         <location filename="../view/PrintDialogs.cpp"/>
         <source>Print</source>
-        <translation type="unfinished"></translation>
+        <translation>印刷</translation>
     </message>
     <message>
         <location filename="../view/PrintDialogs.cpp"/>
         <source>Print Preview</source>
-        <translation type="unfinished"></translation>
+        <translation>印刷プレビュー</translation>
     </message>
     <message>
         <location filename="../view/PrintProgress.cpp"/>
         <source>Printing</source>
-        <translation type="unfinished"></translation>
+        <translation>印刷中</translation>
     </message>
     <message>
         <location filename="../view/PrintProgress.cpp"/>
         <source>Cancel</source>
-        <translation type="unfinished"></translation>
+        <translation>キャンセル</translation>
     </message>
     <message>
         <location filename="../view/PrintProgress.cpp"/>
         <source>Page %1 of %2</source>
-        <translation type="unfinished"></translation>
+        <translation>ページ %1 / %2</translation>
     </message>
     <message>
         <location filename="../view/PrintTarget.cpp"/>
         <source>There is no room left for the pages.</source>
-        <translation type="unfinished"></translation>
+        <translation>ページを保存する空き容量がありません。</translation>
     </message>
     <message>
         <location filename="../view/ReportEdit.cpp"/>
         <source>Report text</source>
-        <translation type="unfinished"></translation>
+        <translation>帳票のテキスト</translation>
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
         <source>Page</source>
-        <translation type="unfinished"></translation>
+        <translation>ページ</translation>
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
         <source>Line</source>
-        <translation type="unfinished"></translation>
+        <translation>行</translation>
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
         <source>Line %1</source>
-        <translation type="unfinished"></translation>
+        <translation>行 %1</translation>
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
         <source>Column</source>
-        <translation type="unfinished"></translation>
+        <translation>桁</translation>
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
         <source>Column %1</source>
-        <translation type="unfinished"></translation>
+        <translation>桁 %1</translation>
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
         <source>Zoom</source>
-        <translation type="unfinished"></translation>
+        <translation>ズーム</translation>
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
         <source>%1 %</source>
-        <translation type="unfinished"></translation>
+        <translation>%1%</translation>
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
         <source>%1 %</source>
         <comment>zoom in percent</comment>
-        <translation type="unfinished"></translation>
+        <translation>%1%</translation>
     </message>
     <message>
         <location filename="../view/UReportViewPrint.cpp"/>
         <source>The margins leave no room for text on the paper. Choose smaller margins under Page Setup.</source>
-        <translation type="unfinished"></translation>
+        <translation>余白が大きく、用紙に印字できる範囲がありません。「ページ設定」で余白を小さくしてください。</translation>
     </message>
     <message>
         <location filename="../view/UReportViewPrint.cpp"/>
         <source>There is nothing to print on the chosen pages.</source>
-        <translation type="unfinished"></translation>
+        <translation>指定したページに印刷する内容がありません。</translation>
     </message>
     <message>
         <location filename="../view/UReportViewPrint.cpp"/>
         <source>The report has changed while it was printed, and nothing of it was sent to the printer. Print it again.</source>
-        <translation type="unfinished"></translation>
+        <translation>印刷中に帳票が変更されたため、プリンターには何も送信されていません。もう一度印刷してください。</translation>
     </message>
     <message>
         <location filename="../view/UReportViewPrint.cpp"/>
         <source>The report could not be printed on "%1". Check the printer, or choose another one, and print again. Nothing of the report is lost.</source>
-        <translation type="unfinished"></translation>
+        <translation>「%1」で帳票を印刷できませんでした。プリンターを確認するか別のプリンターを選んで、もう一度印刷してください。帳票の内容は失われていません。</translation>
     </message>
     <message>
         <location filename="../view/UReportViewPrint.cpp"/>
         <source>The preview shows the first %1 pages. All pages are printed.</source>
-        <translation type="unfinished"></translation>
+        <translation>プレビューには最初の %1 ページが表示されます。印刷は全ページに対して行われます。</translation>
     </message>
     <message>
         <location filename="../view/UReportViewPrint.cpp"/>
         <source>Failed to get default printer settings.</source>
-        <translation type="unfinished"></translation>
+        <translation>通常使うプリンターの設定を取得できませんでした。</translation>
     </message>
     <message>
         <location filename="../ui/CReportToolBar.cpp"/>
         <source>Report</source>
-        <translation type="unfinished"></translation>
+        <translation>帳票</translation>
     </message>
     <message>
         <location filename="../ui/CReportViewPane.cpp"/>
         <source>The Report can only be closed when the associated editor is closed</source>
-        <translation type="unfinished"></translation>
+        <translation>関連付けられたエディターを閉じるまで、この帳票は閉じられません</translation>
     </message>
     <message>
         <location filename="../ui/CReportViewPane.cpp"/>
         <source>Error</source>
         <comment>Alert Message title</comment>
-        <translation type="unfinished"></translation>
+        <translation>エラー</translation>
     </message>
     <message>
         <location filename="../ui/ReportResources.cpp"/>
         <source>KaReport</source>
-        <translation type="unfinished"></translation>
+        <translation>KaReport</translation>
     </message>
     <message>
         <location filename="../ui/ReportResources.cpp"/>
         <source>Save</source>
-        <translation type="unfinished"></translation>
+        <translation>保存</translation>
     </message>
     <message>
         <location filename="../ui/ReportResources.cpp"/>
         <source>View\Edit Report</source>
-        <translation type="unfinished"></translation>
+        <translation>帳票の表示/編集</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CommandSetup.cpp"/>
         <source>--as: one of %1 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>--as: 次のいずれかが必要です: %1</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CommandSetup.cpp"/>
         <source>the ending of "%1" says no kind: --as with one of %2 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>「%1」の拡張子からは種類がわかりません: --as に次のいずれかを指定する必要があります: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CommandSetup.cpp"/>
         <source>--set "%1": KEY=VALUE was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>--set "%1": KEY=VALUE の形式が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>a saved report was expected; this is a PDF</source>
-        <translation type="unfinished"></translation>
+        <translation>保存された帳票が必要です。これは PDF です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>a report file was expected; this is no UTF-8</source>
-        <translation type="unfinished"></translation>
+        <translation>帳票ファイルが必要です。これは UTF-8 ではありません</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>--set "%1": a key of the page was expected, as page.linesPerPage=60</source>
-        <translation type="unfinished"></translation>
+        <translation>--set "%1": page.linesPerPage=60 のようなページのキーが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>--set: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>--set: %1</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>kareport: warning: "%1": %2</source>
-        <translation type="unfinished"></translation>
+        <translation>kareport: 警告: 「%1」: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvObjectList.cpp"/>
         <source>a header row of variable names was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>変数名の見出し行が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvObjectList.cpp"/>
         <source>the column "%1" stands twice: each variable was expected once</source>
-        <translation type="unfinished"></translation>
+        <translation>列「%1」が 2 回あります: 変数はそれぞれ 1 回だけ指定できます</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvObjectList.cpp"/>
         <source>no column of the header row is a variable of the dictionary: a header row of variable names, with the data's delimiter between them, was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>見出し行に辞書の変数がありません: 変数名をデータの区切り文字で区切った見出し行が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvObjectList.cpp"/>
         <source>the row has %1 cells: %2 were expected, as in the header row</source>
-        <translation type="unfinished"></translation>
+        <translation>行のセル数が %1 です: 見出し行と同じ %2 が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvObjectList.cpp"/>
         <source>the cell "%1" of the column "%2" does not fit: %3 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>列「%2」のセル「%1」が不正です: %3が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvReader.cpp"/>
         <source>the file is not UTF-8</source>
-        <translation type="unfinished"></translation>
+        <translation>ファイルが UTF-8 ではありません</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvReader.cpp"/>
         <source>a delimiter was expected behind the closing quote</source>
-        <translation type="unfinished"></translation>
+        <translation>終わりの引用符の後に区切り文字が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvReader.cpp"/>
         <source>a quote inside a cell was not expected: the whole cell must stand in quotes and the quote be doubled</source>
-        <translation type="unfinished"></translation>
+        <translation>セルの途中に引用符は使えません: セル全体を引用符で囲み、中の引用符を 2 つ重ねる必要があります</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvReader.cpp"/>
         <source>a zero byte stands in the file: a text file was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>ファイルにヌルバイトがあります: テキストファイルが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvReader.cpp"/>
         <source>the quoted cell has no closing quote</source>
-        <translation type="unfinished"></translation>
+        <translation>引用符で始まるセルに終わりの引用符がありません</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvReader.cpp"/>
         <source>a carriage return without a line feed was not expected</source>
-        <translation type="unfinished"></translation>
+        <translation>改行 (LF) を伴わない復帰 (CR) は使えません</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvReader.cpp"/>
         <source>the row is longer than %1 bytes: a table of rows was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>行が %1 バイトを超えています: 行からなる表が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/FileBytes.cpp"/>
         <source>more than %1 MB come out of what is no file</source>
-        <translation type="unfinished"></translation>
+        <translation>ファイルではない入力から %1 MB を超えるデータが読み込まれました</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>one of %1 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>次のいずれかが必要です: %1</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>a list of four margins (left, top, right, bottom) was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>4 つの余白 (左、上、右、下) のリストが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>a character code or a text of one character was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>文字コードまたは 1 文字のテキストが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>either "csv" or "values" was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>"csv" と "values" のどちらか一方が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>an object or a list of objects was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>オブジェクトまたはオブジェクトのリストが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>a text of one ASCII character that is neither a quote nor a line end was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>引用符と改行を除く ASCII 1 文字のテキストが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>true was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>true が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>a step was expected: one of heading, line, lineFeed, newPage, block, table, clear</source>
-        <translation type="unfinished"></translation>
+        <translation>heading, line, lineFeed, newPage, block, table, clear のいずれかのステップが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>a "%1" needs a template: the key "template" was expected in the job</source>
-        <translation type="unfinished"></translation>
+        <translation>"%1" にはテンプレートが必要です: ジョブにキー "template" が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>the key "data" with the name of a data set was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>データセット名を値とするキー "data" が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>there is no data set named "%1" in the job</source>
-        <translation type="unfinished"></translation>
+        <translation>ジョブに「%1」という名前のデータセットがありません</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>the key "report" with a list of steps was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>ステップのリストを値とするキー "report" が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>the key "file" was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>キー "file" が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>the ending of "%1" says no kind: the key "as" with one of %2 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>「%1」の拡張子からは種類がわかりません: キー "as" に次のいずれかを指定する必要があります: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>a text that begins with "%1" was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>「%1」で始まるテキストが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>a date and time such as 2024-03-05T14:07:00 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>2024-03-05T14:07:00 のような日時が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>the key "%1" with a text was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>テキストを値とするキー "%1" が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>block</source>
-        <translation type="unfinished"></translation>
+        <translation>ブロック</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>table</source>
-        <translation type="unfinished"></translation>
+        <translation>表</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>the template has no %1 named "%2": one of %3 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートに「%2」という名前の%1がありません。使用できるもの: %3</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>none</source>
-        <translation type="unfinished"></translation>
+        <translation>なし</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>the %1 "%2" cannot be written: the template has no dictionary named "%3"</source>
-        <translation type="unfinished"></translation>
+        <translation>%1「%2」は出力できません: テンプレートに「%3」という名前の辞書がありません</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>the %1 "%2" cannot be written: the format of its field "%3" is beyond %4 characters</source>
-        <translation type="unfinished"></translation>
+        <translation>%1「%2」は出力できません: フィールド「%3」の書式が %4 文字を超えています</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>the data file "%1" cannot be read: %2</source>
-        <translation type="unfinished"></translation>
+        <translation>データファイル「%1」を読み込めません: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>Reading %1</source>
-        <translation type="unfinished"></translation>
+        <translation>読み込み中: %1</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>the data "%1" has no row: a block shows the first one</source>
-        <translation type="unfinished"></translation>
+        <translation>データ「%1」に行がありません: ブロックには最初の行が表示されます</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>a row was expected behind the header row: a block shows the first one</source>
-        <translation type="unfinished"></translation>
+        <translation>見出し行の後に行が必要です: ブロックには最初の行が表示されます</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>the report could not be made</source>
-        <translation type="unfinished"></translation>
+        <translation>帳票を作成できませんでした</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>the margins leave no room on the page: smaller margins or a smaller font were expected</source>
-        <translation type="unfinished"></translation>
+        <translation>余白が大きく、ページに印字できる範囲がありません: 余白またはフォントを小さくする必要があります</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobRunner.cpp"/>
         <source>there is no template file "%1"</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートファイル「%1」がありません</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobSettingsReader.cpp"/>
         <source>a list of three texts was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>3 つのテキストのリストが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobSettingsReader.cpp"/>
         <source>one character with a code up to 255, or an empty text, was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>文字コード 255 以下の 1 文字または空のテキストが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>the file cannot be read: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>ファイルを読み込めません: %1</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>the file is larger than %1 MB: a job was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>ファイルが %1 MB を超えています: ジョブが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>a JSON object was expected: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>JSON オブジェクトが必要です: %1</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>a JSON object was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>JSON オブジェクトが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>there is no place for the key "%1" in the job</source>
-        <translation type="unfinished"></translation>
+        <translation>ジョブにはキー "%1" を設定できません</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>a text was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>テキストが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>true or false was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>true または false が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>a whole number from %1 to %2 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>%1 から %2 までの整数が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>an object was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>オブジェクトが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>a list was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>リストが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>unknown key "%1": %2 expected</source>
-        <translation type="unfinished"></translation>
+        <translation>不明なキー "%1": 使用できるキー: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonObjectList.cpp"/>
         <source>the variable "%1" stands twice: each variable was expected once</source>
-        <translation type="unfinished"></translation>
+        <translation>変数「%1」が 2 回あります: 変数はそれぞれ 1 回だけ指定できます</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonObjectList.cpp"/>
         <source>the value of "%1" does not fit: %2 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>「%1」の値が不正です: %2が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputWriter.cpp"/>
         <source>the report could not be written to standard output: %1</source>
-        <translation type="unfinished"></translation>
+        <translation>帳票を標準出力に書き込めませんでした: %1</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputWriter.cpp"/>
         <source>"%1" could not be written: %2</source>
-        <translation type="unfinished"></translation>
+        <translation>「%1」に書き込めませんでした: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputWriter.cpp"/>
         <source>the report begins as rich text, but %1 (line %2, column %3)</source>
-        <translation type="unfinished"></translation>
+        <translation>帳票はリッチテキストで始まっていますが、エラーがあります: %1 (%2 行 %3 桁)</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputsWriter.cpp"/>
         <source>kareport: stopped before "%1" was written</source>
-        <translation type="unfinished"></translation>
+        <translation>kareport: 「%1」を書き込む前に中断されました</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputsWriter.cpp"/>
         <source>Writing %1</source>
-        <translation type="unfinished"></translation>
+        <translation>書き込み中: %1</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputsWriter.cpp"/>
         <source>kareport: the report is empty: "%1" was not written</source>
-        <translation type="unfinished"></translation>
+        <translation>kareport: 帳票が空です: 「%1」は書き込まれませんでした</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
         <source>either a job file or --template, --name, --table or --block, and --data were expected</source>
-        <translation type="unfinished"></translation>
+        <translation>ジョブファイル、または --template、--name、--data と --table か --block のどちらかが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
         <source>--template, --name, --data and one of --table and --block were expected</source>
-        <translation type="unfinished"></translation>
+        <translation>--template、--name、--data と、--table か --block のどちらか一方が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
         <source>kareport: stopped; nothing was written</source>
-        <translation type="unfinished"></translation>
+        <translation>kareport: 中断されました。何も書き込まれていません</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RowBatches.cpp"/>
         <source>there is not enough memory for the data</source>
-        <translation type="unfinished"></translation>
+        <translation>データを読み込むメモリが足りません</translation>
     </message>
     <message>
         <location filename="../apps/kareport/TemplateSource.cpp"/>
         <source>the template file cannot be read: there is no such file</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートファイルを読み込めません: ファイルがありません</translation>
     </message>
     <message>
         <location filename="../apps/kareport/TemplateSource.cpp"/>
         <source>a template file was expected; this is a folder, a pipe or a device</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートファイルが必要です。これはフォルダー、パイプ、またはデバイスです</translation>
     </message>
     <message>
         <location filename="../apps/kareport/TemplateSource.cpp"/>
         <source>the template file has %1 MB: at most %2 MB were expected</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートファイルが %1 MB あります: %2 MB 以下である必要があります</translation>
     </message>
     <message>
         <location filename="../apps/kareport/TemplateSource.cpp"/>
         <source>the template file cannot be read</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートファイルを読み込めません</translation>
     </message>
     <message>
         <location filename="../apps/kareport/TemplateSource.cpp"/>
         <source>the template file is empty: a &lt;ReportTemplate&gt; element was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートファイルが空です: &lt;ReportTemplate&gt; 要素が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/TemplateSource.cpp"/>
         <source>the template "%1" cannot be loaded: %2</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレート「%1」を読み込めません: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/TemplateSource.cpp"/>
         <source>the file holds no template: a &lt;ReportTemplate&gt; element was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>ファイルにテンプレートがありません: &lt;ReportTemplate&gt; 要素が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/TemplateSource.cpp"/>
         <source>there is no template named "%1": one of %2 was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>「%1」という名前のテンプレートがありません。使用できるもの: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ValueParser.cpp"/>
         <source>a whole number</source>
-        <translation type="unfinished"></translation>
+        <translation>整数</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ValueParser.cpp"/>
         <source>a text</source>
-        <translation type="unfinished"></translation>
+        <translation>テキスト</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ValueParser.cpp"/>
         <source>yes or no</source>
-        <translation type="unfinished"></translation>
+        <translation>yes または no の値</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ValueParser.cpp"/>
         <source>a station such as 12+345.678</source>
-        <translation type="unfinished"></translation>
+        <translation>12+345.678 のような測点</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ValueParser.cpp"/>
         <source>an angle such as 45-30-15</source>
-        <translation type="unfinished"></translation>
+        <translation>45-30-15 のような角度</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ValueParser.cpp"/>
         <source>a number</source>
-        <translation type="unfinished"></translation>
+        <translation>数値</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ViewCommand.cpp"/>
         <source>there is no file "%1"</source>
-        <translation type="unfinished"></translation>
+        <translation>ファイル「%1」がありません</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ViewCommand.cpp"/>
         <source>the program kareport-desk is not installed</source>
-        <translation type="unfinished"></translation>
+        <translation>プログラム kareport-desk がインストールされていません</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ViewCommand.cpp"/>
         <source>there is no display to show a window on: DISPLAY or WAYLAND_DISPLAY was expected</source>
-        <translation type="unfinished"></translation>
+        <translation>ウィンドウを表示するディスプレイがありません: DISPLAY または WAYLAND_DISPLAY が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ViewCommand.cpp"/>
         <source>"%1" could not be started</source>
-        <translation type="unfinished"></translation>
+        <translation>「%1」を起動できませんでした</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskDialogs.cpp"/>
         <source>Save As</source>
-        <translation type="unfinished"></translation>
+        <translation>名前を付けて保存</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>Open a job or a saved report, or drop it here.</source>
-        <translation type="unfinished"></translation>
+        <translation>ジョブまたは保存した帳票を開くか、ここにドロップしてください。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>Open</source>
-        <translation type="unfinished"></translation>
+        <translation>開く</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>Reports, jobs and templates (*.rep *.rtf *.json *.xml)</source>
-        <translation type="unfinished"></translation>
+        <translation>帳票、ジョブ、テンプレート (*.rep *.rtf *.json *.xml)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>All files (*)</source>
-        <translation type="unfinished"></translation>
+        <translation>すべてのファイル (*)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>There is no file "%1".</source>
-        <translation type="unfinished"></translation>
+        <translation>ファイル「%1」がありません。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>"%1" could not be opened.</source>
-        <translation type="unfinished"></translation>
+        <translation>「%1」を開けませんでした。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source> (with changes that were not saved)</source>
-        <translation type="unfinished"></translation>
+        <translation> (未保存の変更あり)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
@@ -1106,699 +1116,710 @@
 %1
 
 Open them again?</source>
-        <translation type="unfinished"></translation>
+        <translation>KaReport は前回正常に終了しませんでした。次の帳票が開かれていました:
+
+%1
+
+もう一度開きますか?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>"%1" was changed by another program, and it has changes here that are not saved. Load it again and lose the changes made here?</source>
-        <translation type="unfinished"></translation>
+        <translation>「%1」は別のプログラムで変更されましたが、ここにも未保存の変更があります。再読み込みして、ここでの変更を破棄しますか?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>"%1" was changed by another program. Load it again?</source>
-        <translation type="unfinished"></translation>
+        <translation>「%1」は別のプログラムで変更されました。再読み込みしますか?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>About KaReport</source>
-        <translation type="unfinished"></translation>
+        <translation>KaReport について</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>KaReport: fixed-pitch reports for civil engineering and surveying.
 
 Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and print it. Ctrl+F finds text, Ctrl+G goes to a page, Ctrl+wheel zooms.</source>
-        <translation type="unfinished"></translation>
+        <translation>KaReport: 土木・測量のための等幅帳票。
+
+ジョブ (.json) を開くと実行されます。保存した帳票 (.rep, .rtf) を開くと、閲覧、編集、印刷ができます。Ctrl+F で検索、Ctrl+G でページへ移動、Ctrl+ホイールで拡大/縮小します。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;File</source>
-        <translation type="unfinished"></translation>
+        <translation>ファイル(&amp;F)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;New	Ctrl+N</source>
-        <translation type="unfinished"></translation>
+        <translation>新規作成(&amp;N)	Ctrl+N</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>New from &amp;Template...	Ctrl+T</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートから新規作成(&amp;T)...	Ctrl+T</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Open...	Ctrl+O</source>
-        <translation type="unfinished"></translation>
+        <translation>開く(&amp;O)...	Ctrl+O</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Close	Ctrl+W</source>
-        <translation type="unfinished"></translation>
+        <translation>閉じる(&amp;C)	Ctrl+W</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Save	Ctrl+S</source>
-        <translation type="unfinished"></translation>
+        <translation>上書き保存(&amp;S)	Ctrl+S</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Save &amp;As...	Ctrl+Shift+S</source>
-        <translation type="unfinished"></translation>
+        <translation>名前を付けて保存(&amp;A)...	Ctrl+Shift+S</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Update Text</source>
-        <translation type="unfinished"></translation>
+        <translation>テキストを更新</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Print...	Ctrl+P</source>
-        <translation type="unfinished"></translation>
+        <translation>印刷(&amp;P)...	Ctrl+P</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Print Pre&amp;view</source>
-        <translation type="unfinished"></translation>
+        <translation>印刷プレビュー(&amp;V)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Pa&amp;ge Setup...</source>
-        <translation type="unfinished"></translation>
+        <translation>ページ設定(&amp;G)...</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Recent File</source>
-        <translation type="unfinished"></translation>
+        <translation>最近使ったファイル</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>E&amp;xit	Ctrl+Q</source>
-        <translation type="unfinished"></translation>
+        <translation>終了(&amp;X)	Ctrl+Q</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Edit</source>
-        <translation type="unfinished"></translation>
+        <translation>編集(&amp;E)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Undo	Ctrl+Z</source>
-        <translation type="unfinished"></translation>
+        <translation>元に戻す(&amp;U)	Ctrl+Z</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Redo	Ctrl+Shift+Z</source>
-        <translation type="unfinished"></translation>
+        <translation>やり直し(&amp;R)	Ctrl+Shift+Z</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Cu&amp;t	Ctrl+X</source>
-        <translation type="unfinished"></translation>
+        <translation>切り取り(&amp;T)	Ctrl+X</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Copy	Ctrl+C</source>
-        <translation type="unfinished"></translation>
+        <translation>コピー(&amp;C)	Ctrl+C</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Paste	Ctrl+V</source>
-        <translation type="unfinished"></translation>
+        <translation>貼り付け(&amp;P)	Ctrl+V</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Select &amp;All	Ctrl+A</source>
-        <translation type="unfinished"></translation>
+        <translation>すべて選択(&amp;A)	Ctrl+A</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Find...	Ctrl+F</source>
-        <translation type="unfinished"></translation>
+        <translation>検索(&amp;F)...	Ctrl+F</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Find &amp;Next	F3</source>
-        <translation type="unfinished"></translation>
+        <translation>次を検索(&amp;N)	F3</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Find Pre&amp;vious	Shift+F3</source>
-        <translation type="unfinished"></translation>
+        <translation>前を検索(&amp;V)	Shift+F3</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Go to Page...	Ctrl+G</source>
-        <translation type="unfinished"></translation>
+        <translation>ページへ移動(&amp;G)...	Ctrl+G</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Pr&amp;eferences...	Ctrl+,</source>
-        <translation type="unfinished"></translation>
+        <translation>設定(&amp;E)...	Ctrl+,</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;View</source>
-        <translation type="unfinished"></translation>
+        <translation>表示(&amp;V)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Toolbar</source>
-        <translation type="unfinished"></translation>
+        <translation>ツールバー(&amp;T)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Status Bar</source>
-        <translation type="unfinished"></translation>
+        <translation>ステータスバー(&amp;S)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Zoom &amp;In	Ctrl++</source>
-        <translation type="unfinished"></translation>
+        <translation>拡大(&amp;I)	Ctrl++</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Zoom &amp;Out	Ctrl+-</source>
-        <translation type="unfinished"></translation>
+        <translation>縮小(&amp;O)	Ctrl+-</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Usual Size	Ctrl+0</source>
-        <translation type="unfinished"></translation>
+        <translation>標準サイズ(&amp;U)	Ctrl+0</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Window</source>
-        <translation type="unfinished"></translation>
+        <translation>ウィンドウ(&amp;W)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;New Window</source>
-        <translation type="unfinished"></translation>
+        <translation>新しいウィンドウ(&amp;N)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Cascade</source>
-        <translation type="unfinished"></translation>
+        <translation>重ねて表示(&amp;C)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Tile Horizontally</source>
-        <translation type="unfinished"></translation>
+        <translation>上下に並べて表示(&amp;T)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Tile Vertically</source>
-        <translation type="unfinished"></translation>
+        <translation>左右に並べて表示</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Arrange Icons</source>
-        <translation type="unfinished"></translation>
+        <translation>アイコンの整列(&amp;A)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Help</source>
-        <translation type="unfinished"></translation>
+        <translation>ヘルプ(&amp;H)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Help	F1</source>
-        <translation type="unfinished"></translation>
+        <translation>ヘルプ(&amp;H)	F1</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;About...</source>
-        <translation type="unfinished"></translation>
+        <translation>バージョン情報(&amp;A)...</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Toolbar</source>
-        <translation type="unfinished"></translation>
+        <translation>ツールバー</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>&amp;Show reports in this program:</source>
-        <translation type="unfinished"></translation>
+        <translation>帳票をこのプログラムで表示(&amp;S):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>Bro&amp;wse...</source>
-        <translation type="unfinished"></translation>
+        <translation>参照(&amp;W)...</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/EditorPage.cpp"/>
+        <source>&amp;Keep a report open while the program is</source>
+        <translation>プログラムが開いている間は帳票を開いたままにする(&amp;K)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>Program that shows reports</source>
-        <translation type="unfinished"></translation>
+        <translation>帳票を表示するプログラム</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>Choose a program, or clear the box above.</source>
-        <translation type="unfinished"></translation>
+        <translation>プログラムを選ぶか、上のチェックを外してください。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>There is no program "%1". Choose one from the list, or with Browse.</source>
-        <translation type="unfinished"></translation>
+        <translation>プログラム「%1」がありません。リストまたは「参照」で選んでください。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>Choose a program</source>
-        <translation type="unfinished"></translation>
+        <translation>プログラムの選択</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>Reports are shown in their own window.</source>
-        <translation type="unfinished"></translation>
+        <translation>帳票は専用のウィンドウに表示されます。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>It gets reports as rich text.</source>
-        <translation type="unfinished"></translation>
+        <translation>帳票はリッチテキストで渡されます。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>It gets reports as plain text.</source>
-        <translation type="unfinished"></translation>
+        <translation>帳票はプレーンテキストで渡されます。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
         <source>There is not enough memory for this input.</source>
-        <translation type="unfinished"></translation>
+        <translation>この入力を処理するメモリが足りません。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Preferences</source>
-        <translation type="unfinished"></translation>
+        <translation>設定</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source> pt</source>
-        <translation type="unfinished"></translation>
+        <translation> pt</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Font size</source>
-        <translation type="unfinished"></translation>
+        <translation>フォントサイズ</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>&amp;Font size of new reports:</source>
-        <translation type="unfinished"></translation>
+        <translation>新しい帳票のフォントサイズ(&amp;F):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>As the system</source>
-        <translation type="unfinished"></translation>
+        <translation>システムの設定に従う</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Language</source>
-        <translation type="unfinished"></translation>
+        <translation>言語</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>&amp;Language (from the next start):</source>
-        <translation type="unfinished"></translation>
+        <translation>言語 (次回の起動から)(&amp;L):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>&amp;Units and Formats</source>
-        <translation type="unfinished"></translation>
+        <translation>単位と書式(&amp;U)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>&amp;Page</source>
-        <translation type="unfinished"></translation>
+        <translation>ページ(&amp;P)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>&amp;Editor</source>
-        <translation type="unfinished"></translation>
+        <translation>エディター(&amp;E)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>P&amp;rogram</source>
-        <translation type="unfinished"></translation>
+        <translation>プログラム(&amp;G)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Report from Template</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートから帳票を作成</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Choose a template file</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートファイルの選択</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Brow&amp;se...</source>
-        <translation type="unfinished"></translation>
+        <translation>参照(&amp;S)...</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Choose a data file</source>
-        <translation type="unfinished"></translation>
+        <translation>データファイルの選択</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Template file</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレートファイル</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Template</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレート</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Table or block</source>
-        <translation type="unfinished"></translation>
+        <translation>表またはブロック</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Data file</source>
-        <translation type="unfinished"></translation>
+        <translation>データファイル</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>&amp;File:</source>
-        <translation type="unfinished"></translation>
+        <translation>ファイル(&amp;F):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>&amp;Template:</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレート(&amp;T):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Table or &amp;block:</source>
-        <translation type="unfinished"></translation>
+        <translation>表またはブロック(&amp;B):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>&amp;Data (CSV):</source>
-        <translation type="unfinished"></translation>
+        <translation>データ (CSV)(&amp;D):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Templates (*.xml);;All files (*)</source>
-        <translation type="unfinished"></translation>
+        <translation>テンプレート (*.xml);;すべてのファイル (*)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Data (*.csv *.txt);;All files (*)</source>
-        <translation type="unfinished"></translation>
+        <translation>データ (*.csv *.txt);;すべてのファイル (*)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>This template has neither a table nor a block.</source>
-        <translation type="unfinished"></translation>
+        <translation>このテンプレートには表もブロックもありません。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>There is no data file "%1".</source>
-        <translation type="unfinished"></translation>
+        <translation>データファイル「%1」がありません。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Metre</source>
-        <translation type="unfinished"></translation>
+        <translation>メートル</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Millimetre</source>
-        <translation type="unfinished"></translation>
+        <translation>ミリメートル</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Kilometre</source>
-        <translation type="unfinished"></translation>
+        <translation>キロメートル</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>International foot</source>
-        <translation type="unfinished"></translation>
+        <translation>国際フィート</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>US survey foot</source>
-        <translation type="unfinished"></translation>
+        <translation>米国測量フィート</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Square metre</source>
-        <translation type="unfinished"></translation>
+        <translation>平方メートル</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Hectare</source>
-        <translation type="unfinished"></translation>
+        <translation>ヘクタール</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Square kilometre</source>
-        <translation type="unfinished"></translation>
+        <translation>平方キロメートル</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Square foot</source>
-        <translation type="unfinished"></translation>
+        <translation>平方フィート</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Acre</source>
-        <translation type="unfinished"></translation>
+        <translation>エーカー</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Degree</source>
-        <translation type="unfinished"></translation>
+        <translation>度</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Gon</source>
-        <translation type="unfinished"></translation>
+        <translation>ゴン (gon)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Radian</source>
-        <translation type="unfinished"></translation>
+        <translation>ラジアン</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Easting, northing</source>
-        <translation type="unfinished"></translation>
+        <translation>東距 (E)、北距 (N)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Northing, easting</source>
-        <translation type="unfinished"></translation>
+        <translation>北距 (N)、東距 (E)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Degrees, minutes, seconds</source>
-        <translation type="unfinished"></translation>
+        <translation>度分秒</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Decimal degrees</source>
-        <translation type="unfinished"></translation>
+        <translation>十進度</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Whole circle</source>
-        <translation type="unfinished"></translation>
+        <translation>全円式</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Quadrant</source>
-        <translation type="unfinished"></translation>
+        <translation>象限式</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>From north</source>
-        <translation type="unfinished"></translation>
+        <translation>北基準</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>From south</source>
-        <translation type="unfinished"></translation>
+        <translation>南基準</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Leading &amp;zeros</source>
-        <translation type="unfinished"></translation>
+        <translation>先頭を 0 で埋める(&amp;Z)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>&amp;Lengths:</source>
-        <translation type="unfinished"></translation>
+        <translation>長さ(&amp;L):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Decimals:</source>
-        <translation type="unfinished"></translation>
+        <translation>小数桁数:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>&amp;Areas:</source>
-        <translation type="unfinished"></translation>
+        <translation>面積(&amp;A):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Decimals of numbers:</source>
-        <translation type="unfinished"></translation>
+        <translation>数値の小数桁数:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>A&amp;ngles:</source>
-        <translation type="unfinished"></translation>
+        <translation>角度(&amp;N):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>&amp;Stations:</source>
-        <translation type="unfinished"></translation>
+        <translation>測点(&amp;S):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>&amp;Coordinates:</source>
-        <translation type="unfinished"></translation>
+        <translation>座標(&amp;C):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>&amp;Bearings:</source>
-        <translation type="unfinished"></translation>
+        <translation>方位角(&amp;B):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Degree mark</source>
-        <translation type="unfinished"></translation>
+        <translation>度の記号</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Minute mark</source>
-        <translation type="unfinished"></translation>
+        <translation>分の記号</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Second mark</source>
-        <translation type="unfinished"></translation>
+        <translation>秒の記号</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Angle &amp;marks:</source>
-        <translation type="unfinished"></translation>
+        <translation>角度の記号(&amp;M):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Looks like</source>
-        <translation type="unfinished"></translation>
+        <translation>表示例</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Unit of lengths</source>
-        <translation type="unfinished"></translation>
+        <translation>長さの単位</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Decimals of lengths</source>
-        <translation type="unfinished"></translation>
+        <translation>長さの小数桁数</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Unit of areas</source>
-        <translation type="unfinished"></translation>
+        <translation>面積の単位</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Decimals of numbers and areas</source>
-        <translation type="unfinished"></translation>
+        <translation>数値と面積の小数桁数</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Unit of angles</source>
-        <translation type="unfinished"></translation>
+        <translation>角度の単位</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Form of stations</source>
-        <translation type="unfinished"></translation>
+        <translation>測点の表記</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Decimals of stations</source>
-        <translation type="unfinished"></translation>
+        <translation>測点の小数桁数</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Order of coordinates</source>
-        <translation type="unfinished"></translation>
+        <translation>座標の順序</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Unit of bearings</source>
-        <translation type="unfinished"></translation>
+        <translation>方位角の単位</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Decimals of bearings</source>
-        <translation type="unfinished"></translation>
+        <translation>方位角の小数桁数</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Style of bearings</source>
-        <translation type="unfinished"></translation>
+        <translation>方位角の表し方</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Reference of bearings</source>
-        <translation type="unfinished"></translation>
+        <translation>方位角の基準方向</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Length</source>
-        <translation type="unfinished"></translation>
+        <translation>長さ</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Area</source>
-        <translation type="unfinished"></translation>
+        <translation>面積</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Angle</source>
-        <translation type="unfinished"></translation>
+        <translation>角度</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Bearing</source>
-        <translation type="unfinished"></translation>
+        <translation>方位角</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Columns</source>
-        <translation type="unfinished"></translation>
+        <translation>列の順序</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>E, N</source>
-        <translation type="unfinished"></translation>
+        <translation>E, N</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>N, E</source>
-        <translation type="unfinished"></translation>
+        <translation>N, E</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/main.cpp"/>
         <source>Runs report jobs, and shows, edits and prints reports.</source>
-        <translation type="unfinished"></translation>
+        <translation>帳票ジョブを実行し、帳票を表示、編集、印刷します。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/main.cpp"/>
-        <source>Jobs (.json) and saved reports (.rep, .rtf) to open</source>
-        <translation type="unfinished"></translation>
+        <source>Jobs (.json), saved reports (.rep, .rtf) and templates (.xml) to open</source>
+        <translation>開くジョブ (.json)、保存した帳票 (.rep, .rtf)、テンプレート (.xml)</translation>
     </message>
 </context>
 </TS>

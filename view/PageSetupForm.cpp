@@ -11,6 +11,7 @@
 #include <QLabel>
 #include <QLocale>
 #include <QRadioButton>
+#include <QSignalBlocker>
 #include <QVBoxLayout>
 
 #include <cmath>
@@ -38,6 +39,8 @@ PageSetupForm::PageSetupForm(const PageSetup &setup, QWidget *parent)
       portrait_(new QRadioButton(Xlate("P&ortrait"))),
       landscape_(new QRadioButton(Xlate("L&andscape"))),
       printer_(new QComboBox),
+      paper_(new QComboBox),
+      paperRow_(new QWidget),
       sheet_(new QLabel),
       warning_(new QLabel)
 {
@@ -55,6 +58,14 @@ PageSetupForm::PageSetupForm(const PageSetup &setup, QWidget *parent)
     printerLayout->addWidget(printer_, 1);
     printerRow->setVisible(setup.printers.size() > 1);
     layout->addWidget(printerRow);
+    auto *paperLayout = new QHBoxLayout(paperRow_);
+    paperLayout->setContentsMargins(0, 0, 0, 0);
+    auto *paperLabel = new QLabel(Xlate("Pap&er:"));
+    paperLabel->setBuddy(paper_);
+    paper_->setAccessibleName(Xlate("Paper"));
+    paperLayout->addWidget(paperLabel);
+    paperLayout->addWidget(paper_, 1);
+    layout->addWidget(paperRow_);
 
     auto *orientation = new QGroupBox(Xlate("Orientation"));
     auto *orientationLayout = new QVBoxLayout(orientation);
@@ -100,8 +111,9 @@ PageSetupForm::PageSetupForm(const PageSetup &setup, QWidget *parent)
     layout->addWidget(warning_);
 
     connect(portrait_, &QRadioButton::toggled, this, &PageSetupForm::showSheet);
-    connect(printer_, &QComboBox::currentIndexChanged, this, &PageSetupForm::showSheet);
-    showSheet();
+    connect(printer_, &QComboBox::currentIndexChanged, this, &PageSetupForm::fillSheets);
+    connect(paper_, &QComboBox::currentIndexChanged, this, &PageSetupForm::showSheet);
+    fillSheets();
     setFocusProxy(margins_[0]);
     margins_[0]->selectAll();
 }
@@ -112,6 +124,10 @@ PageSetup PageSetupForm::setup() const
     setup.portrait = portrait_->isChecked();
     if (setup_.printers.size() > 1) {
         setup.printer = printer_->currentText();
+    }
+    if (const PageSheet *chosen = chosenSheet()) {
+        // The printer's own sheet stays its own, whichever that is then.
+        setup.sheet = paper_->currentIndex() == 0 ? QSize() : chosen->points;
     }
     std::array<int, 4> margins = inOrder(setup_.margins);
     for (std::size_t i = 0; i < margins_.size(); ++i) {
@@ -124,18 +140,41 @@ PageSetup PageSetupForm::setup() const
 bool PageSetupForm::leavesRoom() const
 {
     const PageSetup chosen = setup();
-    const QSizeF upright = setup_.sheetOf ? setup_.sheetOf(chosen.printer) : QSizeF();
-    if (upright.isEmpty()) {
-        return true; // nothing is known of the sheet
+    if (chosenSheet() == nullptr) {
+        return true;
     }
+    const QSizeF upright = chosenSheet()->millimetres;
     const QSizeF sheet = chosen.portrait ? upright : upright.transposed();
     return kareport::leavesRoom({twipsOfMillimetres(sheet.width()), twipsOfMillimetres(sheet.height())},
                                 twipsOfHundredths(chosen.margins));
 }
 
+const PageSheet *PageSetupForm::chosenSheet() const
+{
+    const int index = paper_->currentIndex();
+    return index >= 0 ? &sheets_.at(static_cast<std::size_t>(index)) : nullptr;
+}
+
+void PageSetupForm::fillSheets()
+{
+    const QString printer = setup_.printers.size() > 1 ? printer_->currentText() : setup_.printer;
+    const QSize wanted = sheets_.empty() ? setup_.sheet : chosenSheet()->points;
+    const QSignalBlocker blocker(paper_);
+    paper_->clear();
+    sheets_ = setup_.sheetsOf ? setup_.sheetsOf(printer) : std::vector<PageSheet>();
+    for (const PageSheet &sheet : sheets_) {
+        paper_->addItem(sheet.name);
+        if (sheet.points == wanted) {
+            paper_->setCurrentIndex(paper_->count() - 1);
+        }
+    }
+    paperRow_->setVisible(sheets_.size() > 1);
+    showSheet();
+}
+
 void PageSetupForm::showSheet()
 {
-    const QSizeF upright = setup_.sheetOf ? setup_.sheetOf(setup().printer) : QSizeF();
+    const QSizeF upright = chosenSheet() != nullptr ? chosenSheet()->millimetres : QSizeF();
     const QSizeF sheet = portrait_->isChecked() ? upright : upright.transposed();
     const QLocale locale;
     sheet_->setText(

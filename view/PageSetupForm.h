@@ -10,6 +10,7 @@
 
 #include <array>
 #include <functional>
+#include <vector>
 
 class QComboBox;
 class QDoubleSpinBox;
@@ -19,17 +20,27 @@ class QRadioButton;
 namespace kareport
 {
 
+/// A sheet that a printer takes, upright.
+struct PageSheet
+{
+    QString name;
+    QSize points;
+    QSizeF millimetres;
+};
+
 /// What a page is set up with.
 struct PageSetup
 {
     QMargins margins; ///< hundredths of a millimetre
     bool portrait = true;
-    QString printer;                                ///< empty for the built-in page device
-    QStringList printers;                           ///< to choose from
-    std::function<QSizeF(const QString &)> sheetOf; ///< the upright sheet of a printer in millimetres
+    QString printer;      ///< empty for the built-in page device
+    QStringList printers; ///< to choose from
+    QSize sheet; ///< upright, in points; empty for the printer's own
+    /// The sheets that a printer takes, its own first.
+    std::function<std::vector<PageSheet>(const QString &printer)> sheetsOf;
 };
 
-/// Asks for paper orientation, margins and, where there are several, the printer.
+/// Asks for paper, orientation, margins and, where there are several, the printer.
 class KAREPORT_EXPORT PageSetupForm : public QWidget
 {
 public:
@@ -42,6 +53,8 @@ public:
 
 private:
     bool leavesRoom() const;
+    const PageSheet *chosenSheet() const; ///< null when nothing is known of the printer's sheets
+    void fillSheets();
     void showSheet();
     void checkMargins();
 
@@ -49,6 +62,9 @@ private:
     QRadioButton *portrait_;
     QRadioButton *landscape_;
     QComboBox *printer_;
+    QComboBox *paper_;
+    QWidget *paperRow_;
+    std::vector<PageSheet> sheets_; ///< of the chosen printer
     QLabel *sheet_;
     QLabel *warning_;
     std::array<QDoubleSpinBox *, 4> margins_ = {}; ///< left, top, right, bottom

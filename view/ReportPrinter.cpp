@@ -23,6 +23,11 @@ bool isBuiltIn()
     return defaultPrinter().source == PrinterSource::BuiltIn;
 }
 
+PageSheet asSheet(const QPageSize &size)
+{
+    return {size.name(), size.sizePoints(), size.size(QPageSize::Millimeter)};
+}
+
 QString fileFor(const QString &title)
 {
     static const QRegularExpression notInNames(QStringLiteral("[\\x00-\\x1F/\\\\:*?\"<>|]"));
@@ -51,6 +56,7 @@ std::shared_ptr<QPrinter> makeReportPrinter(bool portrait, const QString &title)
         printer->setPageSize(builtInSheet());
     } else {
         printer = std::make_shared<QPrinter>(applicationPrinter(), QPrinter::HighResolution);
+        setSelectedSheet(*printer);
     }
     if (!printer->isValid()) {
         return nullptr;
@@ -70,21 +76,32 @@ QSize sheetInTwips(const QPrinter &printer)
 void fillPrinters(PageSetup &setup)
 {
     if (isBuiltIn()) {
-        setup.sheetOf = [](const QString &) { return builtInSheet().size(QPageSize::Millimeter); };
+        setup.sheetsOf = [](const QString &) { return std::vector{asSheet(builtInSheet())}; };
         return;
     }
     setup.printer = applicationPrinter().printerName();
     setup.printers = QPrinterInfo::availablePrinterNames();
-    setup.sheetOf = [](const QString &name) {
+    setup.sheet = defaultPrinter().sheet;
+    setup.sheetsOf = [](const QString &name) {
         const QPrinterInfo info = QPrinterInfo::printerInfo(name);
-        return info.isNull() ? QSizeF() : info.defaultPageSize().size(QPageSize::Millimeter);
+        std::vector<PageSheet> sheets;
+        if (!info.isNull()) {
+            sheets.push_back(asSheet(info.defaultPageSize()));
+            for (const QPageSize &size : info.supportedPageSizes()) {
+                if (!size.isEquivalentTo(info.defaultPageSize())) {
+                    sheets.push_back(asSheet(size));
+                }
+            }
+        }
+        return sheets;
     };
 }
 
-void selectPrinter(const QString &name)
+void selectPrinter(const QString &name, const QSize &sheet)
 {
     DefaultPrinter printer = defaultPrinter();
     printer.name = name;
+    printer.sheet = sheet;
     setDefaultPrinter(printer);
 }
 

@@ -23,7 +23,8 @@ QSize sheetInTwips(const QPrinter &printer);
 
 /// The printers to choose from, and the one that is chosen.
 KAREPORT_EXPORT void fillPrinters(PageSetup &setup);
-/// Makes an installed printer the one that the application prints on.
-KAREPORT_EXPORT void selectPrinter(const QString &name);
+/// Makes an installed printer the one that the application prints on. @param sheet  upright, in points; empty for the
+/// printer's own
+KAREPORT_EXPORT void selectPrinter(const QString &name, const QSize &sheet);
 
 } // namespace kareport

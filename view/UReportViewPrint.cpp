@@ -310,7 +310,7 @@ void UReportView::OnPageSetup()
         return;
     }
     UPreviewDlg::SetModulePrinterOrientationPortrait(setup.portrait);
-    kareport::selectPrinter(setup.printer);
+    kareport::selectPrinter(setup.printer, setup.sheet);
     report->SetMargins(setup.margins);
     report->SetPageSize();
     report->SaveSettings();

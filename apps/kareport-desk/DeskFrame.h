@@ -1,5 +1,6 @@
 #pragma once
 
+#include "EditorHold.h"
 #include "FileWatch.h"
 #include "Recovery.h"
 #include "UDocument.h"
@@ -76,4 +77,5 @@ private:
     QToolBar *toolBar_ = nullptr;
     kareport::FileWatch files_;
     kareport::Recovery recovery_;
+    kareport::EditorHold editors_;
 };

@@ -15,6 +15,7 @@ namespace
 
 const QString settingsEntry = QStringLiteral("Job Settings");
 const QString marginsEntry = QStringLiteral("Report Margins");
+const QString keepEntry = QStringLiteral("KeepReportForEditor");
 const QString languageEntry = QStringLiteral("Language");
 constexpr QMargins usualMargins(1000, 1000, 1200, 2000);
 
@@ -50,6 +51,7 @@ DeskPreferences loadPreferences()
     preferences.portrait = IsReportPrinterSetToPortrait();
     preferences.usesEditor = GetUsePreferredReportEditorFlag() != 0;
     preferences.editor = GetProfileString(QString(), GetPreferredReportEditorRegKey());
+    preferences.keepsForEditor = GetProfileString(QString(), keepEntry) != u"0";
     preferences.language = GetProfileString(QString(), languageEntry);
     return preferences;
 }
@@ -64,6 +66,7 @@ void savePreferences(const DeskPreferences &preferences)
     SetReportPrinterSetToPortrait(preferences.portrait);
     SetUsePreferredReportEditorFlag(preferences.usesEditor);
     WriteProfileString(QString(), GetPreferredReportEditorRegKey(), preferences.editor);
+    WriteProfileString(QString(), keepEntry, preferences.keepsForEditor ? QStringLiteral("1") : QStringLiteral("0"));
     WriteProfileString(QString(), languageEntry, preferences.language);
 }
 

@@ -16,13 +16,15 @@
 namespace kareport
 {
 
-EditorPage::EditorPage(bool usesEditor, const QString &editor, QWidget *parent)
+EditorPage::EditorPage(bool usesEditor, const QString &editor, bool keepsReports, QWidget *parent)
     : QWidget(parent),
       uses_(new QCheckBox(Xlate("&Show reports in this program:"))),
       editor_(new QComboBox),
       browse_(new QPushButton(Xlate("Bro&wse..."))),
+      keeps_(new QCheckBox(Xlate("&Keep a report open while the program is"))),
       kind_(new QLabel)
 {
+    keeps_->setChecked(keepsReports);
     uses_->setChecked(usesEditor);
     editor_->setEditable(true);
     editor_->setInsertPolicy(QComboBox::NoInsert);
@@ -41,6 +43,7 @@ EditorPage::EditorPage(bool usesEditor, const QString &editor, QWidget *parent)
     auto *layout = new QVBoxLayout(this);
     layout->addWidget(uses_);
     layout->addLayout(row);
+    layout->addWidget(keeps_);
     layout->addWidget(kind_);
     layout->addStretch();
 
@@ -56,6 +59,11 @@ EditorPage::EditorPage(bool usesEditor, const QString &editor, QWidget *parent)
 bool EditorPage::usesEditor() const
 {
     return uses_->isChecked();
+}
+
+bool EditorPage::keepsReports() const
+{
+    return keeps_->isChecked();
 }
 
 QString EditorPage::editor() const
@@ -89,6 +97,7 @@ void EditorPage::showKind()
 {
     editor_->setEnabled(uses_->isChecked());
     browse_->setEnabled(uses_->isChecked());
+    keeps_->setEnabled(uses_->isChecked());
     if (!uses_->isChecked()) {
         kind_->setText(Xlate("Reports are shown in their own window."));
     } else if (editorKind(editor(), false) == EditorKind::WordProcessor) {

@@ -14,11 +14,13 @@ namespace kareport
 class EditorPage : public QWidget
 {
 public:
-    EditorPage(bool usesEditor, const QString &editor, QWidget *parent = nullptr);
+    EditorPage(bool usesEditor, const QString &editor, bool keepsReports, QWidget *parent = nullptr);
 
     bool usesEditor() const;
     /// The program's full path.
     QString editor() const;
+    /// Whether a report cannot be closed while the program is open.
+    bool keepsReports() const;
     /// Whether the choice can be used. Where it cannot, the page says so and leads to it.
     bool confirm();
 
@@ -29,6 +31,7 @@ private:
     QCheckBox *uses_;
     QComboBox *editor_;
     QPushButton *browse_;
+    QCheckBox *keeps_;
     QLabel *kind_;
 };
 

@@ -40,7 +40,7 @@ PreferencesDialog::PreferencesDialog(const DeskPreferences &preferences, QWidget
       units_(new UnitsPage(preferences.settings)),
       fontSize_(new QSpinBox),
       page_(makePageForm(preferences)),
-      editor_(new EditorPage(preferences.usesEditor, preferences.editor)),
+      editor_(new EditorPage(preferences.usesEditor, preferences.editor, preferences.keepsForEditor)),
       language_(new QComboBox)
 {
     setWindowTitle(Xlate("Preferences"));
@@ -93,6 +93,7 @@ DeskPreferences PreferencesDialog::preferences() const
     preferences.portrait = page.portrait;
     preferences.usesEditor = editor_->usesEditor();
     preferences.editor = editor_->editor();
+    preferences.keepsForEditor = editor_->keepsReports();
     preferences.language = language_->currentData().toString();
     return preferences;
 }

@@ -1,21 +1,27 @@
 #include "DeskApplication.h"
 #include "DeskDialogs.h"
 #include "DeskFrame.h"
+#include "DeskPreferences.h"
+#include "Language.h"
 #include "Xlate.h"
 
 #include <QApplication>
 #include <QCommandLineParser>
+#include <QIcon>
 
 int main(int argc, char **argv)
 {
     QApplication application(argc, argv);
     QApplication::setApplicationName(QStringLiteral("KaReport"));
     QApplication::setApplicationVersion(QStringLiteral(KAREPORT_VERSION));
+    QApplication::setDesktopFileName(QStringLiteral("kareport-desk"));
+    QApplication::setWindowIcon(QIcon::fromTheme(QStringLiteral("kareport")));
+    kareport::setLanguage(kareport::loadPreferences().language);
     QCommandLineParser parser;
     parser.setApplicationDescription(Xlate("Runs report jobs, and shows, edits and prints reports."));
     parser.addHelpOption();
     parser.addVersionOption();
-    parser.addPositionalArgument(QStringLiteral("FILE"), Xlate("Jobs (.json) and saved reports (.rep, .rtf) to open"),
+    parser.addPositionalArgument(QStringLiteral("FILE"), Xlate("Jobs (.json), saved reports (.rep, .rtf) and templates (.xml) to open"),
                                  QStringLiteral("[FILE...]"));
     parser.process(application);
 

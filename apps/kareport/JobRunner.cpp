@@ -195,8 +195,8 @@ private:
     QHash<QString, std::shared_ptr<const FileBytes>> files_; ///< by their paths
 };
 
-JobRunner::JobRunner(const Job &job, JsonSource &source, Progress &progress)
-    : job_(job), source_(source), progress_(progress), surroundings_(job)
+JobRunner::JobRunner(const Job &job, JsonSource &source, Progress &progress, MakeReport make)
+    : job_(job), source_(source), progress_(progress), surroundings_(job), make_(std::move(make))
 {
     // In a program with windows the report belongs to it.
     if (UApplication::Get() == nullptr) {
@@ -219,7 +219,7 @@ std::optional<InputError> JobRunner::prepare()
 {
     // No page is measured before the face is known.
     setDefaultPrinter({PrinterSource::None});
-    report_ = CreateReport(QString(), job_.header, false, nullptr, 0, nullptr);
+    report_ = make_ ? make_(job_.header) : CreateReport(QString(), job_.header, false, nullptr, 0, nullptr);
     if (report_ == nullptr) {
         return InputError{source_.path(), std::nullopt, Xlate("the report could not be made")};
     }

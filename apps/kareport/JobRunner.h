@@ -8,6 +8,7 @@
 #include "UApplication.h"
 #include "UReportDoc.h"
 
+#include <functional>
 #include <memory>
 #include <optional>
 
@@ -18,8 +19,12 @@ namespace kareport
 class JobRunner
 {
 public:
+    /// Makes an empty report, whose title is set later. @return null when it cannot be made
+    using MakeReport = std::function<UReportDoc *(bool header)>;
+
     /// @param source  the job file, for its values and for the places of errors
-    JobRunner(const Job &job, JsonSource &source, Progress &progress);
+    /// @param make    makes the report; empty for one in a pane of its own, where the application has panes
+    JobRunner(const Job &job, JsonSource &source, Progress &progress, MakeReport make = {});
     ~JobRunner();
 
     /// Whether a page has to be measured with a font, which needs a running QGuiApplication.
@@ -42,6 +47,7 @@ private:
     JsonSource &source_;
     Progress &progress_;
     JobSurroundings surroundings_;
+    MakeReport make_;
     std::optional<UApplication> application_; ///< of a program that has none
     UReportDoc *report_ = nullptr;            ///< owned by its document template
 };

@@ -6,6 +6,8 @@
 
 #include <functional>
 
+class UDocument;
+
 namespace kareport
 {
 
@@ -15,12 +17,15 @@ struct EditorLaunch
     QString program; ///< full path
     QString file;    ///< full path; the program's only argument, whatever characters it holds
     QString folder;  ///< the folder that the program works in; empty for the one that this process works in
+    UDocument *document = nullptr; ///< whose text the file holds; may be null
 };
 
 /// Starts a program with a file and lets it go on by itself, also beyond the end of this process. No shell reads the
 /// paths. Nobody is told when the program cannot be started.
 /// @param program, file  where they are relative, they are taken from the folder that this process works in
-KAREPORT_EXPORT void launchEditor(const QString &program, const QString &file, const QString &folder);
+/// @param document  whose text the file holds; may be null
+KAREPORT_EXPORT void launchEditor(const QString &program, const QString &file, const QString &folder,
+                                  UDocument *document = nullptr);
 
 using EditorLauncher = std::function<void(const EditorLaunch &launch)>;
 

@@ -31,8 +31,12 @@ QString GetLibraryDir(bool /*reserved*/)
     if (!folders().library.isEmpty()) {
         return folders().library;
     }
-    return QStandardPaths::writableLocation(QStandardPaths::GenericDataLocation) +
-           QStringLiteral("/kareport/templates");
+    // The user's own folder comes first, then those of the system.
+    const QString name = QStringLiteral("kareport/templates");
+    const QString installed =
+        QStandardPaths::locate(QStandardPaths::GenericDataLocation, name, QStandardPaths::LocateDirectory);
+    return installed.isEmpty() ? QStandardPaths::writableLocation(QStandardPaths::GenericDataLocation) + u'/' + name
+                               : installed;
 }
 
 QString GetStartPathName()

@@ -1,0 +1,65 @@
+#include "EditorHold.h"
+
+#include "DeskPreferences.h"
+#include "EditorLauncher.h"
+#include "ProcessState.h"
+#include "UReportDoc.h"
+
+#include <QProcess>
+
+#include <algorithm>
+
+namespace kareport
+{
+
+namespace
+{
+constexpr int lookInterval = 500; // milliseconds
+}
+
+EditorHold::EditorHold()
+{
+    QObject::connect(&timer_, &QTimer::timeout, &timer_, [this] { look(); });
+    timer_.setInterval(lookInterval);
+    setEditorLauncher([this](const EditorLaunch &launch) { start(launch); });
+}
+
+EditorHold::~EditorHold()
+{
+    setEditorLauncher({});
+}
+
+void EditorHold::start(const EditorLaunch &launch)
+{
+    qint64 process = 0;
+    if (!QProcess::startDetached(launch.program, {launch.file}, launch.folder, &process)) {
+        return;
+    }
+    auto *report = dynamic_cast<UReportDoc *>(launch.document);
+    if (report != nullptr && loadPreferences().keepsForEditor) {
+        report->EnableCloseOption(false);
+        held_.push_back({report, process});
+        timer_.start();
+    }
+}
+
+void EditorHold::look()
+{
+    const auto ended = std::stable_partition(held_.begin(), held_.end(),
+                                             [](const Held &held) { return isProcessRunning(held.process); });
+    const std::vector<Held> released(ended, held_.end());
+    held_.erase(ended, held_.end());
+    for (const Held &held : released) {
+        // Another editor may still hold it.
+        const bool isHeld = std::any_of(held_.begin(), held_.end(),
+                                        [&held](const Held &other) { return other.report == held.report; });
+        if (!isHeld && UReportDoc::IsReportAvailable(held.report)) {
+            held.report->EnableCloseOption(true);
+        }
+    }
+    if (held_.empty()) {
+        timer_.stop();
+    }
+}
+
+} // namespace kareport

@@ -1,0 +1,15 @@
+#include "ProcessState.h"
+
+#include <cerrno>
+#include <csignal>
+
+namespace kareport
+{
+
+bool isProcessRunning(qint64 process)
+{
+    // Signal 0 only asks; a process of somebody else may not be asked, but is there.
+    return process > 0 && (::kill(static_cast<pid_t>(process), 0) == 0 || errno == EPERM);
+}
+
+} // namespace kareport

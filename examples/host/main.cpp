@@ -1,0 +1,149 @@
+// A small host: makes a report of its own lines and one through a template, and saves both into a folder. With --window it
+// does so in a window, and makes one more report that is shown while it is written; without, it needs no display.
+#include <AppMessageBox.h>
+#include <DefaultPrinter.h>
+#include <Folders.h>
+#include <Language.h>
+#include <Profile.h>
+#include <ReportEntry.h>
+#include <ReportInitialTemplate.h>
+#include <ReportWindowEntry.h>
+#include <SaveDialog.h>
+#include <UApplication.h>
+#include <UReportDoc.h>
+#include <UXTPMDIFrameWnd.h>
+
+#include <QApplication>
+#include <QCloseEvent>
+#include <QFileDialog>
+#include <QMenuBar>
+#include <QMessageBox>
+
+#include <cstdio>
+
+UReportDoc *writeByLines()
+{
+    UReportDoc *report = CreateReport(QStringLiteral("Traverse"), true, false, nullptr, 0, nullptr);
+    if (report != nullptr) {
+        report->SetHeading(QStringLiteral("From  To     Distance"), 0, 2); // under the header of every page
+        report->WriteLine(QStringLiteral("1     2       152.438"), 0, 1, 0);
+        report->NewPage(4); // a new page unless more than four lines are left
+        report->WriteLine(QStringLiteral("Closed on point 1"), 1, 1, 1);
+    }
+    return report;
+}
+
+/// Values stand under the identifiers of the template's dictionary, lengths in metres.
+void addPoint(UDataObjectList &points, const char *number, double station, double offset, bool isDone)
+{
+    UDataObject &point = points.Add();
+    point.Set(1, UPointNumber(QString::fromLatin1(number)));
+    point.Set(2, station);
+    point.Set(3, offset);
+    point.Set(9, isDone);
+}
+
+UReportDoc *writeByTemplate()
+{
+    UReportDoc *report = CreateReport(QString(), true, false, nullptr, 0, nullptr);
+    if (report == nullptr) {
+        return nullptr;
+    }
+    UJobSettings settings;
+    settings.stationDecimals = 2;
+    report->SetJobSettings(settings);
+    report->SetZeroBlank(true); // a number that is not there counts as 0
+    if (!report->LoadTemplateXml(QStringLiteral("survey.xml"), QStringLiteral("STAKEOUT"), QString(), QString())) {
+        report->OnCloseDocument();
+        return nullptr;
+    }
+    UDataObject site;
+    site.Set(1, QStringLiteral("Harbour road"));
+    report->WriteDataBlock(QStringLiteral("Site"), &site, 0, 1);
+    UDataObjectList points;
+    addPoint(points, "12", 140.0, 3.75, false);
+    addPoint(points, "11", 120.5, -3.75, true);
+    report->WriteDataTable(QStringLiteral("Points"), &points, 1, 1, -1); // sorted as the table says
+    return report;
+}
+
+void writeInWindow()
+{
+    UReportDoc *report = CreateReportWindow(QStringLiteral("Levelling"), true, false);
+    for (int station = 1; station <= 500 && UReportDoc::IsReportAvailable(report); ++station) {
+        report->WriteLine(QStringLiteral("Station %1").arg(station), 0, 1, 0);
+        QApplication::processEvents(); // the lines appear; the user may close the report
+    }
+    if (UReportDoc::IsReportAvailable(report)) {
+        report->SetReportWindowActive(); // it can be saved, opened and printed now
+    }
+}
+
+bool save(UReportDoc *report, const QString &path)
+{
+    const bool isSaved = report != nullptr && report->OnSaveDocument(path + QStringLiteral(".pdf")) &&
+                         report->OnSaveDocument(path + QStringLiteral(".rep"));
+    std::printf("%s %s\n", qUtf8Printable(path), isSaved ? "saved" : "not saved");
+    return isSaved;
+}
+
+class Frame : public UXTPMDIFrameWnd
+{
+public:
+    Frame()
+    {
+        QMenu *menu = menuBar()->addMenu(QStringLiteral("&File"));
+        AddCommand(*menu, 57604, QStringLiteral("Save &As...\tCtrl+Shift+S")); // handled by the report's view
+        AddCommand(*menu, 57607, QStringLiteral("&Print...\tCtrl+P"));
+        const auto asking = QMessageBox::Yes | QMessageBox::No;
+        kareport::setMessageBox([this, asking](const kareport::Message &message) {
+            const QMessageBox::StandardButtons buttons[] = {QMessageBox::Ok, asking | QMessageBox::Cancel, asking};
+            switch (QMessageBox::question(this, message.caption, message.text, buttons[int(message.buttons)])) {
+            case QMessageBox::Ok: return MessageAnswer::Ok;
+            case QMessageBox::Yes: return MessageAnswer::Yes;
+            case QMessageBox::No: return MessageAnswer::No;
+            default: return MessageAnswer::Cancel;
+            }
+        });
+        kareport::setSaveDialog([this](const kareport::SaveRequest &request) -> std::optional<QString> {
+            const QString path = QFileDialog::getSaveFileName(this, QString(), request.initialFolder);
+            return path.isEmpty() ? std::nullopt : std::optional(path);
+        });
+        show();
+    }
+
+protected:
+    void closeEvent(QCloseEvent *event) override
+    {
+        for (UDocument *report : std::vector(GetReportTemplate()->GetDocuments())) {
+            event->setAccepted(event->isAccepted() && report->SaveModified()); // the user may cancel
+        }
+    }
+};
+
+int main(int argc, char **argv)
+{
+    const bool hasWindow = argc == 3 && qstrcmp(argv[1], "--window") == 0;
+    if (argc != 2 && !hasWindow) {
+        return std::fputs("host [--window] FOLDER\n", stderr), 1;
+    }
+    if (!hasWindow) {
+        qputenv("QT_QPA_PLATFORM", "offscreen"); // a page is measured with a font, which needs no screen
+        kareport::setDefaultPrinter({kareport::PrinterSource::BuiltIn, kareport::PaperSize::A4});
+    }
+    QApplication qt(argc, argv);
+    kareport::setLanguage(QString()); // the system's
+    kareport::setProfileStore(kareport::makeMemoryProfile());
+    kareport::setLibraryDir(QStringLiteral(HOST_TEMPLATES));
+    UApplication application;
+    application.AddDocTemplate(hasWindow ? ReportInitialTemplate() : kareport::makeReportTemplate());
+    const auto frame = hasWindow ? std::make_unique<Frame>() : nullptr;
+    const QString folder = QString::fromLocal8Bit(argv[argc - 1]);
+    bool isSaved = save(writeByLines(), folder + QStringLiteral("/traverse"));
+    isSaved = save(writeByTemplate(), folder + QStringLiteral("/stakeout")) && isSaved;
+    if (hasWindow) {
+        QMetaObject::invokeMethod(&qt, writeInWindow, Qt::QueuedConnection);
+        QApplication::exec();
+    }
+    return isSaved ? 0 : 1;
+}

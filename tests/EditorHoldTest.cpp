@@ -1,0 +1,109 @@
+#include "DeskFixture.h"
+
+#include "DeskPreferences.h"
+#include "EditorLauncher.h"
+
+#include <gtest/gtest.h>
+
+namespace
+{
+
+/// A program that runs as long as a file is there.
+class WaitingEditor
+{
+public:
+    WaitingEditor()
+    {
+        folder_.put("open", "");
+        folder_.put("editor", "#!/bin/sh\ntouch \"" + QFile::encodeName(folder_.path("started")) +
+                                  "\"\nwhile [ -e \"" + QFile::encodeName(folder_.path("open")) +
+                                  "\" ]; do sleep 0.05; done\n");
+        QFile::setPermissions(path(), QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
+    }
+    ~WaitingEditor() { close(); }
+    WaitingEditor(const WaitingEditor &) = delete;
+    WaitingEditor &operator=(const WaitingEditor &) = delete;
+
+    QString path() const { return folder_.path("editor"); }
+    bool hasStarted() const { return QFile::exists(folder_.path("started")); }
+    void close() const { QFile::remove(folder_.path("open")); }
+
+private:
+    JobFolder folder_;
+};
+
+void preferEditor(const QString &path, bool keeps)
+{
+    kareport::DeskPreferences preferences = kareport::loadPreferences();
+    preferences.usesEditor = true;
+    preferences.editor = path;
+    preferences.keepsForEditor = keeps;
+    kareport::savePreferences(preferences);
+}
+
+TEST(EditorHold, AReportStaysOpenWhileItsEditorIs)
+{
+    struct Row
+    {
+        bool keeps;
+        const char *reason;
+    };
+    for (const Row &row : {Row{true, "the user wants it kept"}, Row{false, "the user does not"}}) {
+        const WaitingEditor editor;
+        Desk desk;
+        preferEditor(editor.path(), row.keeps);
+        UReportDoc *report = CreateReport(QStringLiteral("R"), false, true, nullptr, 0, nullptr);
+        report->WriteLine(QStringLiteral("x"), 0, 1, 0);
+        report->UpdateAllViews(nullptr);
+        EXPECT_TRUE(QTest::qWaitFor([&editor] { return editor.hasStarted(); })) << row.reason;
+        EXPECT_EQ(report->EnableCloseOption(), !row.keeps) << row.reason;
+        editor.close();
+        EXPECT_TRUE(QTest::qWaitFor([report] { return report->EnableCloseOption(); })) << row.reason;
+        desk.answer = MessageAnswer::No;
+    }
+}
+
+TEST(EditorHold, TheLastOfSeveralEditorsReleasesIt)
+{
+    const WaitingEditor first;
+    const WaitingEditor second;
+    Desk desk;
+    preferEditor(first.path(), true);
+    UReportDoc *report = CreateReport(QStringLiteral("R"), false, true, nullptr, 0, nullptr);
+    report->WriteLine(QStringLiteral("x"), 0, 1, 0);
+    report->UpdateAllViews(nullptr);
+    preferEditor(second.path(), true);
+    report->UpdateAllViews(nullptr);
+    EXPECT_TRUE(QTest::qWaitFor([&] { return first.hasStarted() && second.hasStarted(); }));
+    first.close();
+    QTest::qWait(1200); // longer than the editors are looked after
+    EXPECT_FALSE(report->EnableCloseOption());
+    second.close();
+    EXPECT_TRUE(QTest::qWaitFor([report] { return report->EnableCloseOption(); }));
+    desk.answer = MessageAnswer::No;
+}
+
+TEST(EditorHold, AReportThatHasGoneMeanwhileIsNotTouched)
+{
+    const WaitingEditor editor;
+    Desk desk;
+    preferEditor(editor.path(), true);
+    UReportDoc *report = CreateReport(QStringLiteral("R"), false, true, nullptr, 0, nullptr);
+    report->WriteLine(QStringLiteral("x"), 0, 1, 0);
+    report->UpdateAllViews(nullptr);
+    EXPECT_TRUE(QTest::qWaitFor([&editor] { return editor.hasStarted(); }));
+    report->OnCloseDocument();
+    editor.close();
+    QTest::qWait(1200);
+    EXPECT_FALSE(UReportDoc::IsReportAvailable(report));
+}
+
+TEST(EditorHold, AProgramThatCannotBeStartedHoldsNothing)
+{
+    Desk desk;
+    UReportDoc *report = CreateReport(QStringLiteral("R"), false, false, nullptr, 0, nullptr);
+    kareport::launchEditor(QStringLiteral("/no/such/program"), QStringLiteral("/tmp/x.rep"), QString(), report);
+    EXPECT_TRUE(report->EnableCloseOption());
+}
+
+} // namespace
