@@ -11,7 +11,9 @@
 #include "ReportPrinter.h"
 #include "ReportViewWidget.h"
 #include "TemplateDialog.h"
+#include "UReportDoc.h"
 #include "UReportView.h"
+#include "UReportWindowDlg.h"
 
 #include <QApplication>
 #include <QCommandLineParser>
@@ -75,6 +77,13 @@ void takeDesk(Pictures &pictures, const QString &examples)
     DeskFrame frame;
     pictures.take(frame, "desk-empty");
     frame.OpenFile(QDir(examples).filePath(QStringLiteral("stakeout.json")));
+    pictures.take(frame, "report-window");
+    auto *report = dynamic_cast<UReportDoc *>(application.GetCurrentReport());
+    if (auto *window = dynamic_cast<UReportWindowDlg *>(report->GetReportWindow())) {
+        window->GetDock()->setFloating(true);
+        pictures.take(*window->GetDock(), "report-window-floating");
+        window->ShowReport();
+    }
     pictures.take(frame, "desk-report");
     for (QAction *menu : frame.menuBar()->actions()) {
         menu->menu()->popup(QPoint());

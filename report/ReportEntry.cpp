@@ -1,5 +1,6 @@
 #include "ReportEntry.h"
 
+#include "NewReport.h"
 #include "ReportViewPort.h"
 #include "ReportWindow.h"
 #include "UApplication.h"
@@ -42,21 +43,6 @@ UDocTemplate *GetReportTemplate()
 UReportDoc *CreateReport(const QString &name, bool headerFlag, bool externalEditor, CViewPane *pane, unsigned style,
                          const QRect *rect)
 {
-    UDocTemplate *reportTemplate = GetReportTemplate();
-    const int show = IsUseExternalEditor(externalEditor) ? 0 : 1;
-    if (reportTemplate == nullptr) {
-        return nullptr;
-    }
-    auto *report =
-        dynamic_cast<UReportDoc *>(reportTemplate->OpenReportDocumentFile(QString(), show, show, pane, style, rect));
-    if (report == nullptr) {
-        return nullptr;
-    }
-    if (!name.isNull()) {
-        report->SetTitle(name);
-        report->SetReportFileName(name);
-    }
-    report->SetHeaderFlag(headerFlag);
-    report->SetExternalEditorFlag(externalEditor);
-    return report;
+    return kareport::openNewReport({name, headerFlag, externalEditor}, !IsUseExternalEditor(externalEditor), pane,
+                                   style, rect);
 }

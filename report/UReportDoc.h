@@ -204,6 +204,9 @@ public:
 
     // --- Identity, title, windows -----------------------------------------------------------------------------------
 
+    /// The window style of a pane that a report opens for itself.
+    static constexpr unsigned ownPaneStyle = 4096;
+
     QString &GetTitle() { return title_; }
     const QString &GetTitle() const { return title_; }
     /// Sets the title and the header line. While an open pane has the title as its caption, the document's title gets a
@@ -226,6 +229,16 @@ public:
     /// Links a report window, which the document destroys with itself; null takes the link away.
     void SetReportWindow(kareport::ReportWindow *window) { reportWindow_ = window; }
     kareport::ReportWindow *GetReportWindow() const { return reportWindow_; }
+    /// Lets the report in its window be saved, printed and opened, and gives the keyboard to the window; nothing without
+    /// one.
+    void SetReportWindowActive();
+    /// Shows a report window or hides it; nothing for null.
+    static void ShowReportBar(kareport::ReportWindow *window, bool show);
+    /// Takes the report up for another run: hides its pane, brings its window back when it was closed, and gives it a name
+    /// and flags as `CreateReport` does. What the report holds stays; a name that its title does not begin with is written
+    /// under it, between blank lines.
+    /// @param name  a null text leaves title and file name as they are
+    void UpdateReportInfo(const QString &name, bool headerFlag, bool externalEditor);
     /// Links the host document that takes the edited text, and the number of its object there.
     void SetTextObject(void *object, unsigned id);
     bool HasTextObj() const { return textObjectId_ != 0; }
@@ -287,6 +300,8 @@ public:
 
     bool OnNewDocument() override;
     bool CanCloseFrame(CViewPane *pane) override;
+    /// The report's window shows it as well.
+    bool IsShown(const CViewPane *except = nullptr) const override;
     void OnCloseDocument() override;
     void OnAutoDelete() override;
     /// Closes the report at once or, when closing has been deferred, asks for it: the next call closes.
@@ -329,9 +344,6 @@ private:
     void showInModule();
     void showFrame();
     void openOwnPane();
-
-    /// The window style of a pane that a report opens for itself.
-    static constexpr unsigned ownPaneStyle = 4096;
 
     /// Every live report, with the value true.
     static QHash<const UReportDoc *, bool> UReportMgr;

@@ -3,9 +3,12 @@
 #include "EditedText.h"
 #include "FileExtension.h"
 #include "Folders.h"
+#include "LineEndings.h"
 #include "PdfExport.h"
 #include "ReplaceFile.h"
+#include "ReportContent.h"
 #include "ReportViewPort.h"
+#include "RichTextReader.h"
 #include "SaveDialog.h"
 #include "StandardText.h"
 #include "TemporaryNames.h"
@@ -15,6 +18,7 @@
 #include "Xlate.h"
 
 #include <QBuffer>
+#include <QTextDocument>
 
 #include <algorithm>
 
@@ -180,6 +184,16 @@ bool UReportDoc::WritePdf(QIODevice &device, kareport::PdfNotes *notes,
     options.lineCount = GetLineCount();
     options.progress = progress;
     const kareport::ReportText &text = page_.text();
+    const bool isSource =
+        text.isNarrow() ? kareport::isRichText(QByteArrayView(text.narrowView())) : kareport::isRichText(text.view());
+    if (openedFromRtf_ && !GetRTFDataFlag() && isSource) {
+        // The text of the document, not its source.
+        QTextDocument document;
+        kareport::showReportContent(*this, document);
+        const QString shown = kareport::withCrLf(document.toPlainText());
+        options.lineCount = static_cast<int>(shown.count(u'\n')) + 1;
+        return kareport::writePdf(device, QStringView(shown), options, notes);
+    }
     return text.isNarrow() ? kareport::writePdf(device, text.narrowView(), options, notes)
                            : kareport::writePdf(device, text.view(), options, notes);
 }

@@ -102,6 +102,12 @@ bool UReportDoc::CanCloseFrame(CViewPane * /*pane*/)
     return SaveModified();
 }
 
+bool UReportDoc::IsShown(const CViewPane *except) const
+{
+    CViewPane *window = reportWindow_ != nullptr ? reportWindow_->GetOwningPane() : nullptr;
+    return (window != nullptr && window->IsVisible()) || UDocument::IsShown(except);
+}
+
 void UReportDoc::CloseReportDocument()
 {
     const bool deferred = closeMode_ == 1;

@@ -11,6 +11,7 @@
 #include "UReportDoc.h"
 
 #include <QCoreApplication>
+#include <QDockWidget>
 #include <QEvent>
 #include <QStandardPaths>
 #include <QTest>

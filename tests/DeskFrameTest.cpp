@@ -1,11 +1,14 @@
 #include "DeskFixture.h"
 
+#include "COneViewPane.h"
 #include "CommandLine.h"
 #include "DeskCommandIds.h"
 #include "DeskPreferences.h"
 #include "ReportEdit.h"
 #include "UApplication.h"
+#include "UReportList.h"
 #include "UReportView.h"
+#include "UReportWindowDlg.h"
 #include "UView.h"
 
 #include <QAction>
@@ -22,6 +25,12 @@ namespace
 {
 
 using namespace kareport;
+
+/// A report file of one line.
+QByteArray savedText(const char *line)
+{
+    return "\xEF\xBB\xBF" + QByteArray(line) + "\r\r\n";
+}
 
 /// All entries of the menus and their menus, with their keys.
 void collect(const QMenu &menu, QStringList &entries)
@@ -48,8 +57,9 @@ TEST(DeskFrame, OpensWhatItIsGiven)
     };
     const Row rows[] = {
         {"a.json", lineJob(), "First line\n", "", "a job is run"},
-        {"a.rep", "\xEF\xBB\xBFTALVEN - N\r\r\nx\r\r\n", "TALVEN - N\n\nx\n\n", "", "a saved report is loaded"},
-        {"A.REP", "TALVEN - N\r\r\n", "TALVEN - N\n\n", "", "case of the ending does not matter"},
+        {"a.rep", "\xEF\xBB\xBFTALVEN - N\r\r\nx\r\r\n", "TALVEN - N\nx\n", "",
+         "a saved report is read as it was before it was saved"},
+        {"A.REP", "\xEF\xBB\xBFTALVEN - N\r\r\n", "TALVEN - N\n", "", "case of the ending does not matter"},
         {"b.rtf", "{\\rtf1 x}", "{\\rtf1 x}\n", "", "rich text keeps its source in the document"},
         {"empty.rep", "", "", "", "an empty file is an empty report"},
         {"bad.json", "{\"report\": [{\"lin\": 1}]}", nullptr, "bad.json:1:", "a job with a mistake says where"},
@@ -77,8 +87,66 @@ TEST(DeskFrame, OpensWhatItIsGiven)
         EXPECT_EQ(UApplication::Get()->GetCurrentReport(), report) << row.reason;
         ASSERT_NE(desk.frame->GetActiveView(), nullptr) << row.reason;
         EXPECT_EQ(desk.frame->GetActiveView()->GetDocument(), report) << row.reason;
+        desk.answer = MessageAnswer::No;
         EXPECT_EQ(UApplication::Get()->GetRecentFileList().value(0), folder.path(row.name)) << row.reason;
     }
+}
+
+TEST(DeskFrame, AJobRunsIntoAReportWindow)
+{
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    const JobFolder folder;
+    folder.put("a.json", lineJob());
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.json")));
+    UReportDoc *report = Desk::reports().front();
+    auto *window = dynamic_cast<UReportWindowDlg *>(report->GetReportWindow());
+    ASSERT_NE(window, nullptr);
+    EXPECT_TRUE(window->IsVisible());
+    EXPECT_TRUE(window->IsActive()) << "it can be saved, printed and opened";
+    EXPECT_EQ(window->GetWindowTextW(), QStringLiteral("Lines"));
+    EXPECT_EQ(report->GetTitle(), QStringLiteral("Lines"));
+    EXPECT_EQ(window->GetList()->GetText(0), QStringLiteral("First line"));
+
+    window->ShowReport();
+    const auto docks = desk.frame->findChildren<QDockWidget *>(QString(), Qt::FindDirectChildrenOnly);
+    EXPECT_EQ(std::count_if(docks.begin(), docks.end(), [](const QDockWidget *dock) { return !dock->isHidden(); }), 1)
+        << "the report stands in one pane";
+    EXPECT_FALSE(window->isCreated());
+    // Closing that pane closes the report.
+    dynamic_cast<COneViewPane *>(report->GetViews().front()->GetParentPane())->OnSysCommand(COneViewPane::scClose, 0);
+    EXPECT_FALSE(UReportDoc::IsReportAvailable(report));
+}
+
+TEST(DeskFrame, AReportWhoseWindowIsClosedCloses)
+{
+    Desk desk;
+    desk.answer = MessageAnswer::No; // it is not to be saved
+    const JobFolder folder;
+    folder.put("a.json", lineJob());
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.json")));
+    UReportDoc *report = Desk::reports().front();
+    QTest::qWait(600); // what is shown stays open
+    ASSERT_TRUE(UReportDoc::IsReportAvailable(report));
+    dynamic_cast<UReportWindowDlg *>(report->GetReportWindow())->OnPressCloseButton();
+    EXPECT_TRUE(QTest::qWaitFor([report] { return !UReportDoc::IsReportAvailable(report); }))
+        << "nobody could ever see it again";
+    EXPECT_EQ(desk.messages.size(), 1) << "asked once";
+}
+
+TEST(DeskFrame, TwoJobsOfOneTitleHaveTitlesOfTheirOwn)
+{
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    const JobFolder folder;
+    folder.put("a.json", QByteArray(lineJob()).replace("\"header\": false", "\"header\": true"));
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.json")));
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.json")));
+    ASSERT_EQ(Desk::reports().size(), 2U);
+    EXPECT_EQ(Desk::reports()[0]->GetTitle(), QStringLiteral("Lines"));
+    EXPECT_EQ(Desk::reports()[1]->GetTitle(), QStringLiteral("Lines 2"));
+    EXPECT_TRUE(Desk::textOf(*Desk::reports()[1]).startsWith(QStringLiteral("TALVEN - Lines  ")))
+        << "the page header has the title as given";
 }
 
 TEST(DeskFrame, AFileThatIsNotThereIsSaid)
@@ -277,8 +345,8 @@ TEST(DeskFrame, ClosingAsksForEveryReportThatHasChanged)
 TEST(DeskFrame, LayoutAndRecentFilesComeBack)
 {
     const JobFolder folder;
-    folder.put("a.rep", "TALVEN\r\r\n");
-    folder.put("b.rep", "TALVEN\r\r\n");
+    folder.put("a.rep", savedText("TALVEN"));
+    folder.put("b.rep", savedText("TALVEN"));
     Desk desk;
     ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.rep")));
     ASSERT_TRUE(desk.frame->OpenFile(folder.path("b.rep")));
@@ -298,7 +366,7 @@ TEST(DeskFrame, LayoutAndRecentFilesComeBack)
 TEST(DeskFrame, WhatIsDroppedIsOpened)
 {
     const JobFolder folder;
-    folder.put("a.rep", "TALVEN\r\r\n");
+    folder.put("a.rep", savedText("TALVEN"));
     folder.put("b.json", lineJob());
     Desk desk;
     QMimeData dropped;
@@ -322,13 +390,13 @@ TEST(DeskFrame, AFileThatChangesOnTheDiskIsOfferedAgain)
         const char *text;
         const char *reason;
     };
-    for (const Row &row : {Row{MessageAnswer::Yes, false, "TALVEN new\n\n", "loaded again"},
-                           Row{MessageAnswer::No, false, "TALVEN\n\n", "left as it was read"},
-                           Row{MessageAnswer::Yes, true, "TALVEN new\n\n", "also over changes, when the user says so"},
-                           Row{MessageAnswer::No, true, "xTALVEN\n\n", "the user's changes stay"}})
+    for (const Row &row : {Row{MessageAnswer::Yes, false, "TALVEN new\n", "loaded again"},
+                           Row{MessageAnswer::No, false, "TALVEN\n", "left as it was read"},
+                           Row{MessageAnswer::Yes, true, "TALVEN new\n", "also over changes, when the user says so"},
+                           Row{MessageAnswer::No, true, "xTALVEN\n", "the user's changes stay"}})
     {
         const JobFolder folder;
-        folder.put("a.rep", "TALVEN\r\r\n");
+        folder.put("a.rep", savedText("TALVEN"));
         Desk desk;
         ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.rep")));
         UReportDoc *report = Desk::reports().front();
@@ -337,7 +405,7 @@ TEST(DeskFrame, AFileThatChangesOnTheDiskIsOfferedAgain)
         }
         QTest::qWait(1); // the watch begins behind the opening
         desk.answer = row.answer;
-        folder.put("a.rep", "TALVEN new\r\r\n");
+        folder.put("a.rep", savedText("TALVEN new"));
         EXPECT_TRUE(QTest::qWaitFor([&desk] { return !desk.messages.isEmpty(); })) << row.reason;
         EXPECT_EQ(desk.messages.value(0).contains(QStringLiteral("not saved")), row.isEdited) << row.reason;
         EXPECT_EQ(Desk::textOf(*report), QString::fromUtf8(row.text)) << row.reason;
@@ -349,8 +417,8 @@ TEST(DeskFrame, AFileThatChangesOnTheDiskIsOfferedAgain)
 TEST(DeskFrame, ItsOwnSavesAreNoChangesOfOthers)
 {
     const JobFolder folder;
-    folder.put("a.rep", "TALVEN\r\r\n");
-    folder.put("other.rep", "TALVEN\r\r\n");
+    folder.put("a.rep", savedText("TALVEN"));
+    folder.put("other.rep", savedText("TALVEN"));
     Desk desk;
     ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.rep")));
     ASSERT_TRUE(desk.frame->OpenFile(folder.path("other.rep")));
@@ -359,7 +427,7 @@ TEST(DeskFrame, ItsOwnSavesAreNoChangesOfOthers)
     ASSERT_TRUE(Desk::reports().front()->DoFileSave());
     QTest::qWait(1);
     // A change of the other file that is told shows that this one would have been told by then.
-    folder.put("other.rep", "TALVEN changed\r\r\n");
+    folder.put("other.rep", savedText("TALVEN changed"));
     EXPECT_TRUE(QTest::qWaitFor([&desk] { return !desk.messages.isEmpty(); }));
     EXPECT_EQ(desk.messages.size(), 1);
     EXPECT_TRUE(desk.messages.value(0).contains(QStringLiteral("other.rep")));

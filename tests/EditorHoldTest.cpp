@@ -15,9 +15,8 @@ public:
     WaitingEditor()
     {
         folder_.put("open", "");
-        folder_.put("editor", "#!/bin/sh\ntouch \"" + QFile::encodeName(folder_.path("started")) +
-                                  "\"\nwhile [ -e \"" + QFile::encodeName(folder_.path("open")) +
-                                  "\" ]; do sleep 0.05; done\n");
+        folder_.put("editor", "#!/bin/sh\ntouch \"" + QFile::encodeName(folder_.path("started")) + "\"\nwhile [ -e \"" +
+                                  QFile::encodeName(folder_.path("open")) + "\" ]; do sleep 0.05; done\n");
         QFile::setPermissions(path(), QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
     }
     ~WaitingEditor() { close(); }

@@ -28,14 +28,13 @@ TEST_F(Languages, TextsFollowTheLanguage)
         const char *holds;
         const char *reason;
     };
-    const QString english = Xlate("Save changes");
-    for (const Row &row : {Row{"de", "de", "German"}, Row{"de_AT", "de", "a country's German"},
-                           Row{"ja", "ja", "Japanese"}, Row{"en", "en", "English has no file"},
-                           Row{"xx", "en", "a language that there is none of"}})
+    const QString english = Xlate("Untitled");
+    for (const Row &row :
+         {Row{"de", "de", "German"}, Row{"de_AT", "de", "a country's German"}, Row{"ja", "ja", "Japanese"},
+          Row{"en", "en", "English has no file"}, Row{"xx", "en", "a language that there is none of"}})
     {
         EXPECT_EQ(kareport::setLanguage(QString::fromUtf8(row.language)), QString::fromUtf8(row.holds)) << row.reason;
-        EXPECT_EQ(Xlate("Save changes") == english, QString::fromUtf8(row.holds) == QStringLiteral("en"))
-            << row.reason;
+        EXPECT_EQ(Xlate("Untitled") == english, QString::fromUtf8(row.holds) == QStringLiteral("en")) << row.reason;
     }
 }
 

@@ -144,8 +144,8 @@ TEST(PageSetupDialog, EveryFieldIsReachedByALetterOfItsLabel)
     for (const auto *button : dialog.findChildren<QRadioButton *>()) {
         letters += button->text()[button->text().indexOf(u'&') + 1].toUpper();
     }
-    EXPECT_EQ(buddies, 5);
-    EXPECT_EQ(letters.size(), 7);
+    EXPECT_EQ(buddies, 6);
+    EXPECT_EQ(letters.size(), 8);
     for (const QChar letter : letters) {
         EXPECT_EQ(letters.count(letter), 1) << QString(letter).toStdString();
     }

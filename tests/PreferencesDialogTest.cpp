@@ -6,6 +6,7 @@
 #include <QComboBox>
 #include <QDialogButtonBox>
 #include <QDoubleSpinBox>
+#include <QKeyEvent>
 #include <QLabel>
 #include <QLineEdit>
 #include <QPushButton>
@@ -127,7 +128,10 @@ TEST_F(PreferencesDialogs, MarksTakeOnlyWhatHasOneByte)
         PreferencesDialog dialog((DeskPreferences()));
         auto *field = control<QLineEdit>(dialog, "Degree mark");
         field->clear();
-        QTest::keyClicks(field, QString::fromUtf8(row.typed));
+        for (const QChar character : QString::fromUtf8(row.typed)) {
+            QKeyEvent key(QEvent::KeyPress, 0, Qt::NoModifier, QString(character));
+            QCoreApplication::sendEvent(field, &key);
+        }
         EXPECT_EQ(dialog.preferences().settings.angleMarks[0], row.mark) << row.reason;
     }
 }
@@ -147,13 +151,13 @@ TEST_F(PreferencesDialogs, IsNotLeftWithWhatCannotBeUsed)
     QFile file(QString::fromUtf8(plain));
     ASSERT_TRUE(file.open(QIODevice::WriteOnly));
     file.close();
-    for (const Row &row : {Row{true, false, "", -1, "no editor is wanted"},
-                           Row{true, false, "/gone", -1, "an editor that is not wanted need not be there"},
-                           Row{true, true, "/bin/sh", -1, "a program that is there"},
-                           Row{true, true, "", 2, "none is named"}, Row{true, true, "/gone", 2, "one that is not there"},
-                           Row{true, true, "sh", 2, "not a full path"}, Row{true, true, "/bin", 2, "a folder"},
-                           Row{true, true, plain.constData(), 2, "a file that is no program"},
-                           Row{false, true, "/bin/sh", 1, "margins as wide as the paper"}})
+    for (const Row &row :
+         {Row{true, false, "", -1, "no editor is wanted"},
+          Row{true, false, "/gone", -1, "an editor that is not wanted need not be there"},
+          Row{true, true, "/bin/sh", -1, "a program that is there"}, Row{true, true, "", 2, "none is named"},
+          Row{true, true, "/gone", 2, "one that is not there"}, Row{true, true, "sh", 2, "not a full path"},
+          Row{true, true, "/bin", 2, "a folder"}, Row{true, true, plain.constData(), 2, "a file that is no program"},
+          Row{false, true, "/bin/sh", 1, "margins as wide as the paper"}})
     {
         DeskPreferences preferences;
         preferences.margins = row.hasRoom ? QMargins(1000, 1000, 1000, 1000) : QMargins(20000, 0, 20000, 0);

@@ -136,8 +136,23 @@ public:
     }
     void WriteLine(const QString &piece) override { pieces += piece; }
     CViewPane *GetOwningPane() override { return pane_; }
+    bool isCreated() const override { return created; }
+    bool createDocked(const QString &caption, UView *previousView) override
+    {
+        calls += QStringLiteral("create ") + caption;
+        previous = previousView;
+        created = canBeCreated;
+        return created;
+    }
+    void showBar(bool show) override { calls += show ? QStringLiteral("show") : QStringLiteral("hide"); }
+    void setActive(bool active) override { calls += active ? QStringLiteral("active") : QStringLiteral("not active"); }
+    void takeFocus() override { calls += QStringLiteral("focus"); }
 
     QStringList pieces;
+    QStringList calls;
+    UView *previous = nullptr;
+    bool created = true;
+    bool canBeCreated = true;
 
 private:
     CViewPane *pane_;

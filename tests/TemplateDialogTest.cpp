@@ -87,12 +87,12 @@ TEST_F(TemplateDialogs, SaysWhatIsWrong)
     };
     folder.put("none.xml", "<x>");
     folder.put("empty.xml", "");
-    for (const Row &row : {Row{"t.xml", 0, "gone.csv", "no data file", "data that is not there"},
-                           Row{"t.xml", 1, "points.csv", "neither a table nor a block", "a template without outputs"},
-                           Row{"gone.xml", 0, "points.csv", "cannot be read", "a file that is not there"},
-                           Row{"none.xml", 0, "points.csv", "ReportTemplate", "no template in the file"},
-                           Row{"empty.xml", 0, "points.csv", "empty", "an empty file"},
-                           Row{".", 0, "points.csv", "folder", "a folder"}})
+    for (const Row &row :
+         {Row{"t.xml", 0, "gone.csv", "no data file", "data that is not there"},
+          Row{"t.xml", 1, "points.csv", "neither a table nor a block", "a template without outputs"},
+          Row{"gone.xml", 0, "points.csv", "cannot be read", "a file that is not there"},
+          Row{"none.xml", 0, "points.csv", "ReportTemplate", "no template in the file"},
+          Row{"empty.xml", 0, "points.csv", "empty", "an empty file"}, Row{".", 0, "points.csv", "folder", "a folder"}})
     {
         TemplateDialog dialog;
         dialog.setTemplateFile(folder.path(row.file));

@@ -2,6 +2,7 @@
 #include "ReportFixture.h"
 
 #include "PdfExport.h"
+#include "PdfReadBack.h"
 
 #include <QBuffer>
 #include <QTemporaryDir>
@@ -173,6 +174,23 @@ TEST(UReportDocPdf, WhatIsMissingIsTold)
     ASSERT_EQ(notes.missing.size(), 1U) << "a character for private use";
     EXPECT_EQ(notes.missing[0].character, U'\U000F0000');
     EXPECT_EQ(notes.missing[0].firstLine, 2);
+}
+
+TEST(UReportDocPdf, AnOpenedRichTextIsWrittenAsItIsRead)
+{
+    const QTemporaryDir folder;
+    const QString path = folder.filePath(QStringLiteral("a.rtf"));
+    putFile(path, "{\\rtf1\\ansi\\ansicpg1251 {\\b \xCF\xF0\xE8}\\par second}");
+    const FixedSurroundings surroundings;
+    UReportDoc report;
+    report.SetAutoDelete(false);
+    ASSERT_TRUE(report.OnOpenDocument(path));
+    const QString pdf = folder.filePath(QStringLiteral("a.pdf"));
+    ASSERT_TRUE(report.OnSaveDocument(pdf));
+    const QString text = PdfReadBack(QByteArray::fromStdString(contentOf(pdf))).pages().join(u'\n');
+    EXPECT_TRUE(text.contains(QStringLiteral("При"))) << text.toStdString();
+    EXPECT_TRUE(text.contains(QStringLiteral("second"))) << text.toStdString();
+    EXPECT_FALSE(text.contains(QStringLiteral("rtf1"))) << "the text, not its source";
 }
 
 } // namespace

@@ -218,7 +218,8 @@ TEST(UReportViewPrint, ASheetWithoutRoomBetweenTheMarginsIsRefused)
     report.report.SetMargins(QMargins(6000, 1000, 6000, 1000)); // room on A4, none on A6
     UReportView &view = report.open();
     view.OnReportPrint();
-    EXPECT_THAT(messages.texts, ElementsAre(testing::Truly([](const QString &text) { return text.contains(u"room"); })));
+    EXPECT_THAT(messages.texts,
+                ElementsAre(testing::Truly([](const QString &text) { return text.contains(u"room"); })));
     EXPECT_EQ(printing.prints, 1) << "the sheet was chosen in the window that asks";
     EXPECT_FALSE(QFile::exists(printing.file()));
 }

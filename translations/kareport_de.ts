@@ -291,7 +291,7 @@
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
-        <source>&amp;Whole word</source>
+        <source>Whole wor&amp;d</source>
         <translation>Nur ganze &amp;Wörter</translation>
     </message>
     <message>
@@ -379,7 +379,7 @@
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
-        <source>&amp;Printer:</source>
+        <source>Pr&amp;inter:</source>
         <translation>&amp;Drucker:</translation>
     </message>
     <message>
@@ -389,7 +389,7 @@
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
-        <source>Pap&amp;er:</source>
+        <source>Pa&amp;per:</source>
         <translation>Pa&amp;pier:</translation>
     </message>
     <message>
@@ -530,11 +530,6 @@
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
         <source>%1 %</source>
-        <translation>%1 %</translation>
-    </message>
-    <message>
-        <location filename="../view/ReportViewWidget.cpp"/>
-        <source>%1 %</source>
         <comment>zoom in percent</comment>
         <translation>%1 %</translation>
     </message>
@@ -598,6 +593,21 @@
         <location filename="../ui/ReportResources.cpp"/>
         <source>View\Edit Report</source>
         <translation>Bericht anzeigen/bearbeiten</translation>
+    </message>
+    <message>
+        <location filename="../ui/UReportWindowDlg.cpp"/>
+        <source>Report lines</source>
+        <translation>Zeilen des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../ui/UReportWindowDlgCommands.cpp"/>
+        <source>Save changes</source>
+        <translation>Änderungen speichern</translation>
+    </message>
+    <message>
+        <location filename="../ui/UReportWindowDlgCommands.cpp"/>
+        <source>to</source>
+        <translation>in</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CommandSetup.cpp"/>
@@ -1458,7 +1468,7 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
-        <source>P&amp;rogram</source>
+        <source>Pro&amp;gram</source>
         <translation>Pro&amp;gramm</translation>
     </message>
     <message>

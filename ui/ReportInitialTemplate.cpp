@@ -6,5 +6,6 @@
 
 std::unique_ptr<UDocTemplate> ReportInitialTemplate()
 {
-    return kareport::makeReportTemplate([] { return new CReportViewPane; }, [] { return std::make_unique<UReportView>(); });
+    return kareport::makeReportTemplate([] { return new CReportViewPane; },
+                                        [] { return std::make_unique<UReportView>(); });
 }

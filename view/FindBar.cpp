@@ -41,7 +41,7 @@ FindBar::FindBar(ReportEdit &edit, QWidget *parent)
       previous_(newButton(this, QStringLiteral("\u2191"), Xlate("Previous match"), QStringLiteral("Shift+F3"))),
       next_(newButton(this, QStringLiteral("\u2193"), Xlate("Next match"), QStringLiteral("F3"))),
       matchCase_(new QCheckBox(Xlate("Match &case"), this)),
-      wholeWord_(new QCheckBox(Xlate("&Whole word"), this)),
+      wholeWord_(new QCheckBox(Xlate("Whole wor&d"), this)),
       count_(new QLabel(this)),
       close_(newButton(this, QStringLiteral("\u00D7"), Xlate("Close the find bar"), QStringLiteral("Esc"))),
       counter_([this] { showCount(); })

@@ -49,7 +49,7 @@ PageSetupForm::PageSetupForm(const PageSetup &setup, QWidget *parent)
     auto *printerRow = new QWidget;
     auto *printerLayout = new QHBoxLayout(printerRow);
     printerLayout->setContentsMargins(0, 0, 0, 0);
-    auto *printerLabel = new QLabel(Xlate("&Printer:"));
+    auto *printerLabel = new QLabel(Xlate("Pr&inter:"));
     printerLabel->setBuddy(printer_);
     printer_->setAccessibleName(Xlate("Printer"));
     printer_->addItems(setup.printers);
@@ -60,7 +60,7 @@ PageSetupForm::PageSetupForm(const PageSetup &setup, QWidget *parent)
     layout->addWidget(printerRow);
     auto *paperLayout = new QHBoxLayout(paperRow_);
     paperLayout->setContentsMargins(0, 0, 0, 0);
-    auto *paperLabel = new QLabel(Xlate("Pap&er:"));
+    auto *paperLabel = new QLabel(Xlate("Pa&per:"));
     paperLabel->setBuddy(paper_);
     paper_->setAccessibleName(Xlate("Paper"));
     paperLayout->addWidget(paperLabel);
@@ -158,7 +158,8 @@ const PageSheet *PageSetupForm::chosenSheet() const
 void PageSetupForm::fillSheets()
 {
     const QString printer = setup_.printers.size() > 1 ? printer_->currentText() : setup_.printer;
-    const QSize wanted = sheets_.empty() ? setup_.sheet : chosenSheet()->points;
+    // A printer's own sheet gives way to the next printer's; one that was chosen is kept where it can be.
+    const QSize wanted = sheets_.empty() ? setup_.sheet : setup().sheet;
     const QSignalBlocker blocker(paper_);
     paper_->clear();
     sheets_ = setup_.sheetsOf ? setup_.sheetsOf(printer) : std::vector<PageSheet>();

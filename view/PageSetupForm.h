@@ -35,7 +35,7 @@ struct PageSetup
     bool portrait = true;
     QString printer;      ///< empty for the built-in page device
     QStringList printers; ///< to choose from
-    QSize sheet; ///< upright, in points; empty for the printer's own
+    QSize sheet;          ///< upright, in points; empty for the printer's own
     /// The sheets that a printer takes, its own first.
     std::function<std::vector<PageSheet>(const QString &printer)> sheetsOf;
 };

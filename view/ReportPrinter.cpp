@@ -33,7 +33,8 @@ QString fileFor(const QString &title)
     static const QRegularExpression notInNames(QStringLiteral("[\\x00-\\x1F/\\\\:*?\"<>|]"));
     QString name = title;
     name.replace(notInNames, QStringLiteral("_"));
-    const QDir folder(QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation));
+    const QString documents = QStandardPaths::writableLocation(QStandardPaths::DocumentsLocation);
+    const QDir folder(QDir(documents).exists() ? documents : QDir::homePath());
     return folder.filePath((name.trimmed().isEmpty() ? QStringLiteral("report") : name.trimmed()) +
                            QStringLiteral(".pdf"));
 }
@@ -85,7 +86,9 @@ void fillPrinters(PageSetup &setup)
     setup.sheetsOf = [](const QString &name) {
         const QPrinterInfo info = QPrinterInfo::printerInfo(name);
         std::vector<PageSheet> sheets;
-        if (!info.isNull()) {
+        if (info.isNull()) {
+            sheets.push_back(asSheet(builtInSheet())); // which stands in for a printer
+        } else {
             sheets.push_back(asSheet(info.defaultPageSize()));
             for (const QPageSize &size : info.supportedPageSizes()) {
                 if (!size.isEquivalentTo(info.defaultPageSize())) {

@@ -52,7 +52,7 @@ ReportViewWidget::ReportViewWidget(QWidget *parent)
       pageLabel_(newLabel(this, Xlate("Page"), Xlate("Page %1 of %2").arg(88888).arg(88888))),
       lineLabel_(newLabel(this, Xlate("Line"), Xlate("Line %1").arg(8888888))),
       columnLabel_(newLabel(this, Xlate("Column"), Xlate("Column %1").arg(8888))),
-      zoomLabel_(newLabel(this, Xlate("Zoom"), Xlate("%1 %").arg(888)))
+      zoomLabel_(newLabel(this, Xlate("Zoom"), Xlate("%1 %@@zoom in percent").arg(888)))
 {
     auto *status = new QHBoxLayout;
     status->setContentsMargins(6, 2, 6, 2);

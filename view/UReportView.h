@@ -121,10 +121,10 @@ private:
     kareport::ReportEdit *edit_ = nullptr; ///< owned by the widget
     std::vector<kareport::Command> commands_;
     WordWrap m_nWordWrap = WrapNone;
-    bool isMirrored_ = false; ///< whether the document holds the control's text, its lines ended by CR LF
+    bool isMirrored_ = false;   ///< whether the document holds the control's text, its lines ended by CR LF
     quint64 mirroredEdits_ = 0; ///< the document's edits by then
     bool showsFormats_ = false; ///< whether the control's text was rich text
-    QMargins m_rectMargin;    ///< twips
-    QSize m_sizePaper;        ///< twips
+    QMargins m_rectMargin;      ///< twips
+    QSize m_sizePaper;          ///< twips
     std::vector<qint64> m_aPageStart;
 };

@@ -5,6 +5,7 @@
 #include "JobLauncher.h"
 #include "PreferencesDialog.h"
 #include "ReportEntry.h"
+#include "SavedReports.h"
 #include "TemplateDialog.h"
 #include "UApplication.h"
 #include "UReportDoc.h"
@@ -40,6 +41,18 @@ bool isOpen(const UDocument *document)
     return std::find(documents.begin(), documents.end(), document) != documents.end();
 }
 
+/// Closes reports that nobody can see or close any more, as after their window was closed. What an editor outside holds is
+/// hidden on purpose.
+void closeUnseen()
+{
+    for (UDocument *document : openDocuments()) {
+        const auto *report = dynamic_cast<UReportDoc *>(document);
+        if (report != nullptr && isOpen(document) && !report->GetExternalEditorFlag() && !report->IsShown()) {
+            document->OnCloseDocument();
+        }
+    }
+}
+
 } // namespace
 
 DeskFrame::DeskFrame() : files_([this](const QString &path) { fileChanged(path); })
@@ -67,6 +80,10 @@ DeskFrame::DeskFrame() : files_([this](const QString &path) { fileChanged(path);
     };
     loadLayout();
     UpdateCommands();
+    constexpr int lookInterval = 500; // milliseconds
+    auto *looking = new QTimer(this);
+    connect(looking, &QTimer::timeout, this, [] { closeUnseen(); });
+    looking->start(lookInterval);
     constexpr int keepInterval = 5000; // milliseconds
     auto *timer = new QTimer(this);
     connect(timer, &QTimer::timeout, this, [this] { recovery_.keep(); });
@@ -154,7 +171,7 @@ bool DeskFrame::OpenFile(const QString &path)
         error = Xlate("There is no file \"%1\".").arg(path);
     } else {
         const QString file = QFileInfo(path).absoluteFilePath();
-        report = GetReportTemplate()->OpenReportDocumentFile(file, 1, 1, nullptr, 0, nullptr);
+        report = kareport::openSavedReport(file);
         error = report == nullptr ? Xlate("\"%1\" could not be opened.").arg(path) : QString();
     }
     return finishOpening(report, error);
@@ -171,8 +188,8 @@ void DeskFrame::OfferLeftReports()
         const MessageAnswer answer = kareport::showMessage(
             {Xlate("KaReport did not end properly the last time. These reports were open:\n\n%1\n\nOpen them again?")
                  .arg(names.join(u'\n')),
-             QString(), MessageButtons::YesNo, kareport::MessageIcon::Question});
-        if (answer != MessageAnswer::Yes && answer != MessageAnswer::No) {
+             QString(), MessageButtons::YesNoCancel, kareport::MessageIcon::Question});
+        if (answer == MessageAnswer::Cancel) {
             return; // they are offered again at the next start
         }
         for (const kareport::KeptReport &kept : left) {
@@ -207,8 +224,9 @@ void DeskFrame::NoteDocumentEvent(UDocument &document, UDocument::DocumentEvent 
 
 void DeskFrame::fileChanged(const QString &path)
 {
-    for (UDocument *document : openDocuments()) {
-        if (document->GetPathName() != path) {
+    for (UDocument *open : openDocuments()) {
+        auto *document = dynamic_cast<UReportDoc *>(open);
+        if (document == nullptr || document->GetPathName() != path) {
             continue;
         }
         const QString question =
@@ -219,23 +237,12 @@ void DeskFrame::fileChanged(const QString &path)
         const MessageAnswer answer = kareport::showMessage(
             {question.arg(path), QString(), MessageButtons::YesNo, kareport::MessageIcon::Question});
         if (answer == MessageAnswer::Yes && isOpen(document)) {
-            reload(*document);
+            if (!kareport::reloadSavedReport(*document)) {
+                kareport::showMessage({Xlate("\"%1\" could not be opened.").arg(path), QString(), MessageButtons::Ok,
+                                       kareport::MessageIcon::None});
+            }
         }
         return;
-    }
-}
-
-void DeskFrame::reload(UDocument &document)
-{
-    const QString path = document.GetPathName();
-    if (auto *report = dynamic_cast<UReportDoc *>(&document)) {
-        report->Clear();
-    }
-    const bool isLoaded = document.OnOpenDocument(path);
-    document.UpdateAllViews(nullptr, 0, nullptr);
-    if (!isLoaded) {
-        kareport::showMessage({Xlate("\"%1\" could not be opened.").arg(path), QString(), MessageButtons::Ok,
-                               kareport::MessageIcon::None});
     }
 }
 

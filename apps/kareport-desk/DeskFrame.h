@@ -61,7 +61,6 @@ private:
     bool finishOpening(UDocument *report, const QString &error);
     void activate(UDocument *report);
     void fileChanged(const QString &path);
-    void reload(UDocument &document);
 
     void newWindow();
     void arrange(Qt::Orientation orientation);

@@ -1,6 +1,7 @@
 #include "DeskFrame.h"
 
-#include "CViewPane.h"
+#include "COneViewPane.h"
+#include "PaneDock.h"
 #include "Profile.h"
 #include "ReportEntry.h"
 
@@ -26,7 +27,9 @@ void DeskFrame::dockAll(const std::function<void(QDockWidget *, QDockWidget *)> 
 {
     QDockWidget *before = nullptr;
     for (QDockWidget *dock : findChildren<QDockWidget *>(QString(), Qt::FindDirectChildrenOnly)) {
-        if (dock->isHidden() || (dockWidgetArea(dock) != Qt::TopDockWidgetArea && !dock->isFloating())) {
+        const auto *paneDock = dynamic_cast<kareport::PaneDock *>(dock);
+        if (dock->isHidden() || paneDock == nullptr || paneDock->pane() == nullptr ||
+            !paneDock->pane()->CanBeTabbedDocument()) {
             continue; // panes beside the reports keep their places
         }
         dock->setFloating(false);

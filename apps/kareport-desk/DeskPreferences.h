@@ -17,9 +17,9 @@ struct DeskPreferences
     QMargins margins;      ///< hundredths of a millimetre
     bool portrait = true;
     bool usesEditor = false;
-    QString editor;           ///< full path
+    QString editor;             ///< full path
     bool keepsForEditor = true; ///< a report cannot be closed while the editor is open
-    QString language; ///< such as "de"; empty for the system's
+    QString language;           ///< such as "de"; empty for the system's
 
     /// What jobs are made with where they do not say otherwise.
     JobDefaults jobDefaults() const;

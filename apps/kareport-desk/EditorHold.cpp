@@ -51,8 +51,8 @@ void EditorHold::look()
     held_.erase(ended, held_.end());
     for (const Held &held : released) {
         // Another editor may still hold it.
-        const bool isHeld = std::any_of(held_.begin(), held_.end(),
-                                        [&held](const Held &other) { return other.report == held.report; });
+        const bool isHeld =
+            std::any_of(held_.begin(), held_.end(), [&held](const Held &other) { return other.report == held.report; });
         if (!isHeld && UReportDoc::IsReportAvailable(held.report)) {
             held.report->EnableCloseOption(true);
         }

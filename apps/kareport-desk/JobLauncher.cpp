@@ -1,13 +1,17 @@
 #include "JobLauncher.h"
 
+#include "CViewPane.h"
 #include "DeskPreferences.h"
 #include "Interrupt.h"
 #include "JobReader.h"
 #include "JobRunner.h"
 #include "Progress.h"
+#include "ReportWindow.h"
+#include "ReportWindowEntry.h"
 #include "Xlate.h"
 
 #include <QCoreApplication>
+#include <QFileInfo>
 #include <QProgressDialog>
 
 #include <new>
@@ -44,6 +48,24 @@ private:
     QProgressDialog dialog_;
 };
 
+CViewPane *paneOf(const UReportDoc &report)
+{
+    return report.GetReportWindow() != nullptr ? report.GetReportWindow()->GetOwningPane() : nullptr;
+}
+
+/// A report that is shown in a report window while it is written.
+UReportDoc *makeShown(bool header, const QString &caption)
+{
+    // The job gives the title; a title that is given twice would be numbered.
+    UReportDoc *report = CreateReportWindow(QString(), header, loadPreferences().usesEditor);
+    if (report != nullptr) {
+        if (CViewPane *pane = paneOf(*report)) {
+            pane->SetWindowTextW(caption);
+        }
+    }
+    return report;
+}
+
 UReportDoc *runJob(Expected<JsonSource> read, QWidget *parent, QString &error)
 {
     if (const InputError *wrong = errorOf(read)) {
@@ -60,7 +82,8 @@ UReportDoc *runJob(Expected<JsonSource> read, QWidget *parent, QString &error)
     UReportDoc *report = nullptr;
     bool isMade = false;
     {
-        JobRunner runner(job, source, progress);
+        const QString caption = job.title.value_or(QFileInfo(source.path()).completeBaseName());
+        JobRunner runner(job, source, progress, [&caption](bool header) { return makeShown(header, caption); });
         const auto wrong = runner.run();
         report = runner.madeReport();
         if (wrong) {
@@ -73,7 +96,10 @@ UReportDoc *runJob(Expected<JsonSource> read, QWidget *parent, QString &error)
         return nullptr;
     }
     if (report != nullptr) {
-        report->UpdateAllViews(nullptr, 0, nullptr);
+        if (CViewPane *pane = paneOf(*report)) {
+            pane->SetWindowTextW(report->GetTitle());
+        }
+        report->SetReportWindowActive();
     }
     return report;
 }

@@ -73,7 +73,7 @@ PreferencesDialog::PreferencesDialog(const DeskPreferences &preferences, QWidget
     tabs_->addTab(units_, Xlate("&Units and Formats"));
     tabs_->addTab(page, Xlate("&Page"));
     tabs_->addTab(editor_, Xlate("&Editor"));
-    tabs_->addTab(program, Xlate("P&rogram"));
+    tabs_->addTab(program, Xlate("Pro&gram"));
 
     auto *layout = new QVBoxLayout(this);
     layout->addWidget(tabs_);

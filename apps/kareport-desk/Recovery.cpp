@@ -2,6 +2,7 @@
 
 #include "ReplaceFile.h"
 #include "ReportEntry.h"
+#include "SavedReports.h"
 #include "UReportDoc.h"
 #include "UReportView.h"
 
@@ -122,9 +123,7 @@ void Recovery::discardLeft()
 UReportDoc *Recovery::reopen(const KeptReport &kept)
 {
     if (kept.textFile.isEmpty()) {
-        return QFile::exists(kept.path) ? dynamic_cast<UReportDoc *>(GetReportTemplate()->OpenReportDocumentFile(
-                                              kept.path, 1, 1, nullptr, 0, nullptr))
-                                        : nullptr;
+        return QFile::exists(kept.path) ? openSavedReport(kept.path) : nullptr;
     }
     QFile file(kept.textFile);
     if (!file.open(QIODevice::ReadOnly)) {

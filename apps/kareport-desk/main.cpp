@@ -21,7 +21,8 @@ int main(int argc, char **argv)
     parser.setApplicationDescription(Xlate("Runs report jobs, and shows, edits and prints reports."));
     parser.addHelpOption();
     parser.addVersionOption();
-    parser.addPositionalArgument(QStringLiteral("FILE"), Xlate("Jobs (.json), saved reports (.rep, .rtf) and templates (.xml) to open"),
+    parser.addPositionalArgument(QStringLiteral("FILE"),
+                                 Xlate("Jobs (.json), saved reports (.rep, .rtf) and templates (.xml) to open"),
                                  QStringLiteral("[FILE...]"));
     parser.process(application);
 

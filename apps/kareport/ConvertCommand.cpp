@@ -6,9 +6,9 @@
 #include "JobRunner.h"
 #include "LineEndings.h"
 #include "OutputsWriter.h"
-#include "PageHeader.h"
 #include "ReportTextDecoder.h"
 #include "RichTextReader.h"
+#include "SavedText.h"
 #include "Xlate.h"
 
 #include <QJsonArray>
@@ -71,21 +71,6 @@ QByteArrayView richTextIn(QByteArrayView bytes)
     return isRichText(text) ? bytes.sliced(text.data() - bytes.data()) : QByteArrayView();
 }
 
-/// Writes a text into a report that is kept in rich-text mode as well: line by line, as reports are written.
-void writeLines(UReportDoc &report, QStringView text)
-{
-    while (!text.isEmpty()) {
-        const qsizetype feed = text.indexOf(u'\n');
-        QStringView line = text.first(feed < 0 ? text.size() : feed);
-        text = text.sliced(feed < 0 ? text.size() : feed + 1);
-        if (feed >= 0 && line.endsWith(u'\r')) {
-            line.chop(1);
-        }
-        report.Write(line.toString(), 0);
-        report.LineFeed(feed < 0 ? 0 : 1);
-    }
-}
-
 } // namespace
 
 std::optional<QString> ConvertCommand::usageError() const
@@ -134,9 +119,8 @@ ExitStatus ConvertCommand::run(int &argc, char **argv) const
     }
     // The pages of a PDF are those that the report was written in; no other kind has pages.
     if (!job.page.linesPerPage) {
-        job.page.linesPerPage = job.outputs.front().kind == OutputKind::Pdf
-                                    ? linesBetweenPageHeaders(saved.text, Xlate("   Page:@@Report Header"))
-                                    : PageGeometry().linesPerPage;
+        job.page.linesPerPage =
+            job.outputs.front().kind == OutputKind::Pdf ? linesOfPages(saved.text) : PageGeometry().linesPerPage;
     }
     job.page.charsPerRow = job.page.charsPerRow.value_or(PageGeometry().charsPerRow);
     if (!application) {

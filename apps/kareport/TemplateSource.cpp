@@ -43,7 +43,8 @@ InputError whyNotLoaded(const QString &path, const TemplateFile &file, const QSt
                 name.isEmpty() ? remark->text
                                : Xlate("the template \"%1\" cannot be loaded: %2").arg(name, remark->text)};
     }
-    const QStringList names = templateNames(file);
+    QStringList names = templateNames(file);
+    names.removeAll(QString()); // a template without a name cannot be chosen
     if (names.isEmpty()) {
         return {path, TextPlace(), Xlate("the file holds no template: a <ReportTemplate> element was expected")};
     }

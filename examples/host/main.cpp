@@ -29,16 +29,16 @@ UReportDoc *writeByLines()
         report->WriteLine(QStringLiteral("1     2       152.438"), 0, 1, 0);
         report->NewPage(4); // a new page unless more than four lines are left
         report->WriteLine(QStringLiteral("Closed on point 1"), 1, 1, 1);
+        report->UpdateAllViews(nullptr); // shows what was written
     }
     return report;
 }
 
-/// Values stand under the identifiers of the template's dictionary, lengths in metres.
 void addPoint(UDataObjectList &points, const char *number, double station, double offset, bool isDone)
 {
     UDataObject &point = points.Add();
-    point.Set(1, UPointNumber(QString::fromLatin1(number)));
-    point.Set(2, station);
+    point.Set(1, UPointNumber(QString::fromLatin1(number))); // by the identifiers of the template's dictionary
+    point.Set(2, station);                                   // metres
     point.Set(3, offset);
     point.Set(9, isDone);
 }
@@ -46,17 +46,15 @@ void addPoint(UDataObjectList &points, const char *number, double station, doubl
 UReportDoc *writeByTemplate()
 {
     UReportDoc *report = CreateReport(QString(), true, false, nullptr, 0, nullptr);
-    if (report == nullptr) {
+    if (report == nullptr ||
+        !report->LoadTemplateXml(QStringLiteral("survey.xml"), QStringLiteral("STAKEOUT"), QString(), QString()))
+    {
         return nullptr;
     }
     UJobSettings settings;
     settings.stationDecimals = 2;
     report->SetJobSettings(settings);
     report->SetZeroBlank(true); // a number that is not there counts as 0
-    if (!report->LoadTemplateXml(QStringLiteral("survey.xml"), QStringLiteral("STAKEOUT"), QString(), QString())) {
-        report->OnCloseDocument();
-        return nullptr;
-    }
     UDataObject site;
     site.Set(1, QStringLiteral("Harbour road"));
     report->WriteDataBlock(QStringLiteral("Site"), &site, 0, 1);
@@ -64,6 +62,7 @@ UReportDoc *writeByTemplate()
     addPoint(points, "12", 140.0, 3.75, false);
     addPoint(points, "11", 120.5, -3.75, true);
     report->WriteDataTable(QStringLiteral("Points"), &points, 1, 1, -1); // sorted as the table says
+    report->UpdateAllViews(nullptr);
     return report;
 }
 
@@ -109,6 +108,7 @@ public:
             const QString path = QFileDialog::getSaveFileName(this, QString(), request.initialFolder);
             return path.isEmpty() ? std::nullopt : std::optional(path);
         });
+        resize(1000, 700);
         show();
     }
 

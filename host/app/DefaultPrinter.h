@@ -33,7 +33,7 @@ struct DefaultPrinter
     PaperSize paper = PaperSize::ByLocale; ///< of the built-in page device
     int resolution = 600;                  ///< of the built-in page device, dots per inch
     QString name = QString(); ///< of the installed printer that the user has selected; empty for the system's
-    QSize sheet = QSize(); ///< of the installed printer, upright, in points; empty for the printer's own
+    QSize sheet = QSize();    ///< of the installed printer, upright, in points; empty for the printer's own
 };
 
 KAREPORT_EXPORT const DefaultPrinter &defaultPrinter();

@@ -21,7 +21,8 @@ void launchEditor(const QString &program, const QString &file, const QString &fo
 {
     // A relative path would be looked for in the program's folder; a bare name of a program even along the search path,
     // and one of a file that begins with "-" would be read as an option.
-    const EditorLaunch launch{QFileInfo(program).absoluteFilePath(), QFileInfo(file).absoluteFilePath(), folder, document};
+    const EditorLaunch launch{QFileInfo(program).absoluteFilePath(), QFileInfo(file).absoluteFilePath(), folder,
+                              document};
     if (editorLauncher()) {
         editorLauncher()(launch);
     } else {

@@ -56,6 +56,26 @@ QStringList translatedLanguages()
     return languages;
 }
 
+QStringList inAllLanguages(const char *text)
+{
+    const QByteArray whole(text);
+    const qsizetype mark = whole.indexOf("@@");
+    const QByteArray shown = mark < 0 ? whole : whole.first(mark);
+    const QByteArray note = mark < 0 ? QByteArray() : whole.sliced(mark + 2);
+    QStringList texts(QString::fromUtf8(shown));
+    for (const QString &language : translatedLanguages()) {
+        QTranslator translator;
+        const QString translated =
+            translator.load(QStringLiteral("kareport_") + language, folder)
+                ? translator.translate("KaReport", shown.constData(), mark < 0 ? nullptr : note.constData())
+                : QString();
+        if (!translated.isEmpty()) {
+            texts.append(translated);
+        }
+    }
+    return texts;
+}
+
 QString setLanguage(const QString &language)
 {
     for (const auto &translator : std::exchange(installed(), {})) {

@@ -11,6 +11,9 @@ namespace kareport
 /// The languages that texts are translated into, such as "de"; English is always there.
 KAREPORT_EXPORT QStringList translatedLanguages();
 
+/// A text as each of the languages has it, English first. @param text  as for `Xlate`
+KAREPORT_EXPORT QStringList inAllLanguages(const char *text);
+
 /// Shows texts in a language from now on, those of Qt's own windows included where Qt has them. Windows that are open keep
 /// theirs.
 /// @param language  such as "de" or "de_AT"; empty for the system's

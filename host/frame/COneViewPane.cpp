@@ -1,54 +1,41 @@
 #include "COneViewPane.h"
 
+#include "PaneDock.h"
+#include "UDocument.h"
 #include "UView.h"
 #include "UXTPMDIFrameWnd.h"
 
-#include <QAction>
-#include <QCloseEvent>
-#include <QDockWidget>
-
-/// The dock widget of a pane: its close box asks the pane.
-class COneViewPane::Dock : public QDockWidget
+COneViewPane::COneViewPane()
 {
-public:
-    explicit Dock(COneViewPane *pane) : pane_(pane) { setFocusPolicy(Qt::NoFocus); }
-
-    void leavePane() { pane_ = nullptr; }
-
-protected:
-    void closeEvent(QCloseEvent *event) override
-    {
-        if (pane_ == nullptr) {
-            QDockWidget::closeEvent(event);
-            return;
-        }
-        // The pane, when it closes, takes this widget away later: it must outlive the event.
-        event->ignore();
-        const QPointer<Dock> self(this);
-        pane_->OnSysCommand(scClose, 0);
-        if (self && self->pane_ != nullptr) {
-            toggleViewAction()->setChecked(true); // the pane has not closed
-        }
-    }
-
-private:
-    COneViewPane *pane_;
-};
-
-COneViewPane::COneViewPane() : dock_(new Dock(this))
-{
-    dock_->setAttribute(Qt::WA_DeleteOnClose, false);
-    dock_->setObjectName(QStringLiteral("pane")); // a frame that saves its layout asks for one
+    MakeDock();
 }
 
 COneViewPane::~COneViewPane()
 {
+    DropDock();
+}
+
+void COneViewPane::MakeDock()
+{
+    if (!dock_) {
+        dock_ = new kareport::PaneDock(this);
+    }
+}
+
+void COneViewPane::DropDock()
+{
     if (dock_) {
-        static_cast<Dock *>(dock_.data())->leavePane();
+        dock_->leavePane();
         dock_->setWidget(nullptr);
         dock_->hide();
         dock_->deleteLater();
+        dock_.clear();
     }
+}
+
+QDockWidget *COneViewPane::GetDock() const
+{
+    return dock_;
 }
 
 void COneViewPane::AddView(std::unique_ptr<UView> view)
@@ -78,9 +65,7 @@ void COneViewPane::SetPlace(CViewPane *parent, unsigned style, const QRect *rect
 void COneViewPane::UpdateTitle()
 {
     if (dock_) {
-        // On tabs and title bars an ampersand marks a key.
-        dock_->setWindowTitle(GetCaption().replace(u'&', QStringLiteral("&&")));
-        dock_->setAccessibleName(GetCaption());
+        dock_->setCaption(GetCaption());
     }
 }
 
@@ -110,9 +95,27 @@ void COneViewPane::BringToTop()
     }
 }
 
+void COneViewPane::SetCaptionState(CaptionState state)
+{
+    if (dock_) {
+        dock_->setMarked(state == captionHighlighted);
+    }
+}
+
+COneViewPane::CaptionState COneViewPane::GetCaptionState() const
+{
+    return dock_ && dock_->isMarked() ? captionHighlighted : captionPlain;
+}
+
 void COneViewPane::OnSysCommand(unsigned command, long /*parameter*/)
 {
-    if (command == scClose && CanClosePane()) {
+    if (command != scClose || !CanClosePane()) {
+        return;
+    }
+    UDocument *document = GetActiveDocument();
+    if (document != nullptr && document->GetViews().size() > 1 && !document->IsShown(this)) {
+        document->OnCloseDocument(); // its other panes are hidden: nobody could ever close it
+    } else {
         ClosePane();
     }
 }

@@ -6,12 +6,24 @@
 #include <QDockWidget>
 #include <QPointer>
 
+namespace kareport
+{
+class PaneDock;
+}
+
 /// A pane of the main frame that shows one view in a dock widget: docked, floating, or as a tab among others.
 class KAREPORT_EXPORT COneViewPane : public CViewPane
 {
 public:
     /// The system command of a pane's close box.
     static constexpr unsigned scClose = 61536;
+
+    /// How the caption is shown.
+    enum CaptionState
+    {
+        captionPlain = 0,
+        captionHighlighted = 2
+    };
 
     COneViewPane();
     ~COneViewPane() override;
@@ -27,10 +39,20 @@ public:
     /// A system command of the pane. Closing asks `CanClosePane`; other commands do nothing here.
     virtual void OnSysCommand(unsigned command, long parameter);
 
-    QDockWidget *GetDock() const { return dock_; }
+    /// Whether the pane may stand among the documents as one of their tabs.
+    virtual bool CanBeTabbedDocument() const { return true; }
+    void SetCaptionState(CaptionState state);
+    CaptionState GetCaptionState() const;
+
+    /// The pane's dock widget; null once it has gone with the frame that it stood in.
+    QDockWidget *GetDock() const;
+
+protected:
+    /// Makes the dock widget again where there is none any more.
+    void MakeDock();
+    /// Takes the dock widget away, with all that stands in it.
+    void DropDock();
 
 private:
-    class Dock;
-
-    QPointer<QDockWidget> dock_;
+    QPointer<kareport::PaneDock> dock_;
 };

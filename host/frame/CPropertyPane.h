@@ -10,6 +10,8 @@ public:
     CPropertyPane();
     ~CPropertyPane() override;
 
+    bool HasDocumentTitle() const override { return false; }
+
     /// Called when a document has changed; with null for one that has closed since.
     virtual void OnUpdateProperties(UDocument *document);
 

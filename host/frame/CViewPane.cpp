@@ -94,7 +94,9 @@ void CViewPane::GetPaneTitles(QStringList &titles)
 {
     titles.clear();
     for (const CViewPane *pane : openPanes()) {
-        titles.append(pane->GetWindowTextW());
+        if (pane->HasDocumentTitle()) {
+            titles.append(pane->GetWindowTextW());
+        }
     }
 }
 
@@ -102,6 +104,8 @@ void CViewPane::GetPaneCaptions(QStringList &captions)
 {
     captions.clear();
     for (const CViewPane *pane : openPanes()) {
-        captions.append(pane->GetCaption());
+        if (pane->HasDocumentTitle()) {
+            captions.append(pane->GetCaption());
+        }
     }
 }

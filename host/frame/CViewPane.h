@@ -57,9 +57,12 @@ public:
     /// Closes the pane without asking: its views go, and the pane itself with them.
     virtual void ClosePane();
 
+    /// Whether the caption is the title of a document. That of a pane with a body of its own is not.
+    virtual bool HasDocumentTitle() const { return true; }
+
     /// Whether a pointer is a pane that is open.
     static bool IsOpen(const CViewPane *pane);
-    /// The captions of all open panes, in the order in which they were opened.
+    /// The captions of all open panes that have a document's title, in the order in which they were opened.
     static void GetPaneCaptions(QStringList &captions);
     /// The same without the numbers that panes of one document have.
     static void GetPaneTitles(QStringList &titles);

@@ -187,6 +187,14 @@ bool UDocument::CanCloseFrame(CViewPane *pane)
     return shownElsewhere || SaveModified();
 }
 
+bool UDocument::IsShown(const CViewPane *except) const
+{
+    return std::any_of(views_.begin(), views_.end(), [except](const UView *view) {
+        const CViewPane *pane = view->GetParentPane();
+        return pane != nullptr && pane != except && pane->IsVisible();
+    });
+}
+
 void UDocument::CloseAllPanes()
 {
     const bool autoDelete = autoDelete_;

@@ -69,6 +69,8 @@ public:
     virtual bool SaveModified();
     /// Whether a pane that shows the document may be closed.
     virtual bool CanCloseFrame(CViewPane *pane);
+    /// Whether the user can see the document in a window. @param except  a pane that does not count; null for none
+    virtual bool IsShown(const CViewPane *except = nullptr) const;
     /// Closes the panes and the document.
     virtual void OnCloseDocument();
     virtual void DeleteContents();

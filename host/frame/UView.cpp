@@ -5,10 +5,11 @@
 #include "UDocument.h"
 #include "UXTPMDIFrameWnd.h"
 
-UView::UView() = default;
+UView::UView() : handle_(std::make_shared<UView *>(this)) {}
 
 UView::~UView()
 {
+    *handle_ = nullptr;
     if (UXTPMDIFrameWnd::Get() != nullptr) {
         UXTPMDIFrameWnd::Get()->ResetActiveViewForFrameAndPane(this);
     }

@@ -4,9 +4,12 @@
 
 #include <QtGlobal>
 
+#include <memory>
+
 class CViewPane;
 class QWidget;
 class UDocument;
+class XInput;
 
 /// A view of a document, shown in a pane. The pane owns it.
 class KAREPORT_EXPORT UView
@@ -24,6 +27,14 @@ public:
     /// The pane that shows the view; null for a view without one.
     CViewPane *GetParentPane() const { return pane_; }
 
+    /// A place that holds the view, and null once it has gone: for those who remember a view that may go meanwhile.
+    std::shared_ptr<UView *const> GetHandle() const { return handle_; }
+
+    /// The input operation that the view is in the middle of, not owned; null for none.
+    XInput *Top() const { return top_; }
+    /// Whoever begins an operation sets it, and takes it away when it ends.
+    void SetTop(XInput *input) { top_ = input; }
+
     /// The window that shows the view, owned by it; null for a view without one.
     virtual QWidget *GetWidget() { return nullptr; }
 
@@ -40,4 +51,6 @@ private:
 
     UDocument *document_ = nullptr;
     CViewPane *pane_ = nullptr;
+    XInput *top_ = nullptr;
+    std::shared_ptr<UView *> handle_;
 };

@@ -1,10 +1,12 @@
 #include "UXTPMDIFrameWnd.h"
 
 #include "COneViewPane.h"
+#include "PaneDock.h"
 #include "UView.h"
 
 #include <QAction>
 #include <QDockWidget>
+#include <QEvent>
 #include <QMenu>
 #include <QTimer>
 
@@ -104,10 +106,29 @@ void UXTPMDIFrameWnd::UpdateCommands()
     }
 }
 
+bool UXTPMDIFrameWnd::event(QEvent *event)
+{
+    const bool taken = QMainWindow::event(event);
+    if (event->type() == QEvent::LayoutRequest) {
+        // Another dock widget may have become a tab with one that must have no tabs: only that one knows then.
+        for (QDockWidget *dock : findChildren<QDockWidget *>()) {
+            auto *paneDock = dynamic_cast<kareport::PaneDock *>(dock);
+            if (paneDock != nullptr && paneDock->isTabbedAgainstItsWill()) {
+                QMetaObject::invokeMethod(paneDock, &kareport::PaneDock::standAlone, Qt::QueuedConnection);
+            }
+        }
+    }
+    return taken;
+}
+
 void UXTPMDIFrameWnd::DockPane(COneViewPane &pane)
 {
     QDockWidget *first = nullptr;
     for (QDockWidget *dock : findChildren<QDockWidget *>(QString(), Qt::FindDirectChildrenOnly)) {
+        const auto *paneDock = dynamic_cast<const kareport::PaneDock *>(dock);
+        if (paneDock != nullptr && paneDock->pane() != nullptr && !paneDock->pane()->CanBeTabbedDocument()) {
+            continue;
+        }
         if (dock != pane.GetDock() && dockWidgetArea(dock) == Qt::TopDockWidgetArea && !dock->isFloating()) {
             first = dock;
         }

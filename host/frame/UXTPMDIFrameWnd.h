@@ -45,6 +45,9 @@ public:
 
     const std::vector<kareport::Command> &commands() const override;
 
+protected:
+    bool event(QEvent *event) override;
+
 private:
     CRibbonBar ribbonBar_;
     UView *activeView_ = nullptr;

@@ -1,15 +1,20 @@
 #include <ReportEntry.h>
+#include <ReportInitialTemplate.h>
 #include <UApplication.h>
 #include <UReportDoc.h>
 
 #include <DefaultPrinter.h>
 #include <Profile.h>
 
+#include <QApplication>
+
 #include <cstdio>
 
 /// A host of one function: it makes a report and asks whether its text is there.
-int main()
+int main(int argc, char **argv)
 {
+    qputenv("QT_QPA_PLATFORM", "offscreen");
+    const QApplication qt(argc, argv); // reports have windows
     kareport::setProfileStore(kareport::makeMemoryProfile());
     kareport::setDefaultPrinter({kareport::PrinterSource::None});
     UApplication application;

@@ -1,0 +1,75 @@
+#include "SavedReports.h"
+
+#include "FileBytes.h"
+#include "ReportEntry.h"
+#include "ReportTextDecoder.h"
+#include "RichTextReader.h"
+#include "SavedText.h"
+#include "UReportDoc.h"
+
+#include <optional>
+
+namespace kareport
+{
+
+namespace
+{
+
+/// The text of a report file as it was before it was saved: each line end once, and UTF-8 as the characters that it stands
+/// for. Nothing for rich text and for what is no UTF-8, which the report loads byte by byte.
+std::optional<QString> exactText(const QString &path)
+{
+    const auto file = FileBytes::open(path);
+    if (errorOf(file) != nullptr || path.endsWith(u".rtf", Qt::CaseInsensitive)) {
+        return std::nullopt;
+    }
+    const std::string_view view = std::get<std::shared_ptr<const FileBytes>>(file)->view();
+    QString text;
+    const QByteArrayView bytes(view.data(), static_cast<qsizetype>(view.size()));
+    if (decodeReportText(bytes, text) || isRichText(text)) {
+        return std::nullopt;
+    }
+    return text;
+}
+
+void fill(UReportDoc &report, const QString &text)
+{
+    report.Clear();
+    // Its pages are those that it was written in, whatever a page would be measured to now.
+    report.FixPage(linesOfPages(text), std::nullopt);
+    report.SetPageSize();
+    writeLines(report, text);
+    report.UpdateAllViews(nullptr, 0, nullptr);
+    report.SetModifiedFlag(false);
+}
+
+} // namespace
+
+UReportDoc *openSavedReport(const QString &path)
+{
+    const auto text = exactText(path);
+    if (!text) {
+        return dynamic_cast<UReportDoc *>(GetReportTemplate()->OpenReportDocumentFile(path, 1, 1, nullptr, 0, nullptr));
+    }
+    UReportDoc *report = CreateReport(QString(), true, false, nullptr, 0, nullptr);
+    if (report != nullptr) {
+        fill(*report, *text);
+        report->SetPathName(path, true);
+        report->OnDocumentEvent(UDocument::DocumentEvent::AfterOpenDocument);
+    }
+    return report;
+}
+
+bool reloadSavedReport(UReportDoc &report)
+{
+    if (const auto text = exactText(report.GetPathName())) {
+        fill(report, *text);
+        return true;
+    }
+    report.Clear();
+    const bool isLoaded = report.OnOpenDocument(report.GetPathName());
+    report.UpdateAllViews(nullptr, 0, nullptr);
+    return isLoaded;
+}
+
+} // namespace kareport

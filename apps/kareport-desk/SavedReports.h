@@ -1,0 +1,15 @@
+#pragma once
+
+#include <QString>
+
+class UReportDoc;
+
+namespace kareport
+{
+
+/// Opens a saved report in a pane. @return null when it cannot be opened
+UReportDoc *openSavedReport(const QString &path);
+/// Replaces what a report holds by its file. @return false when it cannot be read; the report is then empty
+bool reloadSavedReport(UReportDoc &report);
+
+} // namespace kareport

@@ -1,0 +1,132 @@
+#include "PaneDock.h"
+
+#include "COneViewPane.h"
+
+#include <QAction>
+#include <QCloseEvent>
+#include <QMainWindow>
+#include <QPointer>
+#include <QStyleOptionDockWidget>
+#include <QStylePainter>
+
+#include <algorithm>
+
+namespace kareport
+{
+
+namespace
+{
+
+QMainWindow *frameOf(const QWidget &dock)
+{
+    // Floating docks that were dropped on each other stand in a window between.
+    for (QWidget *parent = dock.parentWidget(); parent != nullptr; parent = parent->parentWidget()) {
+        if (auto *frame = qobject_cast<QMainWindow *>(parent)) {
+            return frame;
+        }
+    }
+    return nullptr;
+}
+
+} // namespace
+
+PaneDock::PaneDock(COneViewPane *pane) : pane_(pane)
+{
+    setFocusPolicy(Qt::NoFocus);
+    setObjectName(QStringLiteral("pane")); // a frame that saves its layout asks for one
+    setAttribute(Qt::WA_DeleteOnClose, false);
+    connect(this, &QDockWidget::topLevelChanged, this, &PaneDock::showCaption);
+    // The frame is still in the middle of placing it.
+    connect(this, &QDockWidget::dockLocationChanged, this, &PaneDock::standAlone, Qt::QueuedConnection);
+}
+
+void PaneDock::setCaption(const QString &caption)
+{
+    caption_ = caption;
+    showCaption();
+}
+
+void PaneDock::setMarked(bool marked)
+{
+    if (marked_ != marked) {
+        marked_ = marked;
+        showCaption();
+        update();
+    }
+}
+
+void PaneDock::showCaption()
+{
+    // On tabs and title bars an ampersand marks a key.
+    const QString text = QString(caption_).replace(u'&', QStringLiteral("&&"));
+    setWindowTitle(marked_ && isFloating() ? QStringLiteral("\u25CF ") + text : text);
+    setAccessibleName(caption_);
+}
+
+bool PaneDock::isTabbedAgainstItsWill() const
+{
+    if (pane_ == nullptr || pane_->CanBeTabbedDocument()) {
+        return false;
+    }
+    QMainWindow *frame = frameOf(*this);
+    // A frame that makes tabs of all that it docks would only do it again.
+    if (frame == nullptr || frame->dockOptions().testFlag(QMainWindow::ForceTabbedDocks)) {
+        return false;
+    }
+    if (parentWidget() != frame) {
+        return true;
+    }
+    const auto tabs = isFloating() ? QList<QDockWidget *>() : frame->tabifiedDockWidgets(const_cast<PaneDock *>(this));
+    // A floating dock widget keeps a place in the row that it came from.
+    return std::any_of(tabs.begin(), tabs.end(), [](const QDockWidget *tab) { return !tab->isFloating(); });
+}
+
+void PaneDock::standAlone()
+{
+    if (!isTabbedAgainstItsWill()) {
+        return;
+    }
+    QMainWindow *frame = frameOf(*this);
+    const Qt::DockWidgetArea area = frame->dockWidgetArea(this);
+    frame->addDockWidget(area == Qt::NoDockWidgetArea ? Qt::BottomDockWidgetArea : area, this);
+}
+
+void PaneDock::closeEvent(QCloseEvent *event)
+{
+    if (pane_ == nullptr) {
+        QDockWidget::closeEvent(event);
+        return;
+    }
+    // The pane, when it closes, takes this widget away later: it must outlive the event.
+    event->ignore();
+    const QPointer<PaneDock> self(this);
+    pane_->OnSysCommand(COneViewPane::scClose, 0);
+    if (self && self->pane_ != nullptr) {
+        toggleViewAction()->setChecked(true); // the pane has not closed
+    }
+}
+
+void PaneDock::paintEvent(QPaintEvent *event)
+{
+    QDockWidget::paintEvent(event);
+    QStyleOptionDockWidget option;
+    initStyleOption(&option);
+    // Where the window system draws the caption, the content stands in its place.
+    if (!marked_ || (widget() != nullptr && option.rect.intersects(widget()->geometry()))) {
+        return;
+    }
+    // Not behind the buttons: styles draw them for the colour of the window.
+    const QRect text = style()->subElementRect(QStyle::SE_DockWidgetTitleBarText, &option, this);
+    QRect marked = option.rect;
+    if (layoutDirection() == Qt::LeftToRight) {
+        marked.setRight(text.right());
+    } else {
+        marked.setLeft(text.left());
+    }
+    QStylePainter painter(this);
+    painter.fillRect(marked, palette().color(QPalette::Highlight));
+    option.palette.setColor(QPalette::WindowText, palette().color(QPalette::HighlightedText));
+    painter.drawControl(QStyle::CE_DockWidgetTitle, option);
+}
+
+} // namespace kareport

@@ -1,0 +1,45 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QDockWidget>
+
+class COneViewPane;
+
+namespace kareport
+{
+
+/// The dock widget of a pane: its close box asks the pane, its caption can be marked, and where the pane must not become a
+/// tab it leaves every row of tabs that it gets into.
+class KAREPORT_EXPORT PaneDock : public QDockWidget
+{
+public:
+    explicit PaneDock(COneViewPane *pane);
+
+    /// The pane; null once that has gone.
+    COneViewPane *pane() const { return pane_; }
+    void leavePane() { pane_ = nullptr; }
+
+    void setCaption(const QString &caption);
+    /// Shows the caption highlighted: by its colour, and where the window system draws it, by a dot before the text.
+    void setMarked(bool marked);
+    bool isMarked() const { return marked_; }
+
+    /// Whether the dock widget is in a row of tabs that the pane does not stand in.
+    bool isTabbedAgainstItsWill() const;
+    /// Leaves such a row for a place of its own in the same area.
+    void standAlone();
+
+protected:
+    void closeEvent(QCloseEvent *event) override;
+    void paintEvent(QPaintEvent *event) override;
+
+private:
+    void showCaption();
+
+    COneViewPane *pane_;
+    QString caption_;
+    bool marked_ = false;
+};
+
+} // namespace kareport

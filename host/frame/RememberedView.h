@@ -1,0 +1,32 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <memory>
+
+class UView;
+
+namespace kareport
+{
+
+/// A view that is to get its place back after something else came to the front. It may go meanwhile.
+class KAREPORT_EXPORT RememberedView
+{
+public:
+    /// @param view  null for none
+    explicit RememberedView(const UView *view = nullptr);
+    /// The active view of the main frame; none without a frame.
+    static RememberedView active();
+
+    /// The view; null once it has gone.
+    UView *get() const { return handle_ ? *handle_ : nullptr; }
+    /// Brings the view's pane to the front. @return false without a view or for one without a pane
+    bool bringToTop() const;
+    /// Does that, and makes the view the active one of the main frame.
+    void reactivate() const;
+
+private:
+    std::shared_ptr<UView *const> handle_;
+};
+
+} // namespace kareport

@@ -1,0 +1,109 @@
+#pragma once
+
+#include "CPropertyPane.h"
+#include "CommandTarget.h"
+#include "KaReportExport.h"
+#include "RememberedView.h"
+#include "ReportWindow.h"
+
+#include <QPointer>
+
+class CReportToolBar;
+class QEvent;
+class UReportDoc;
+class UReportList;
+
+namespace kareport
+{
+class ReportWindowBody;
+}
+
+/// The report window: a pane at the bottom of the main frame that shows the lines of a report as they are written, with
+/// buttons to save it, to open it in its own view and to print it once it is marked active.
+///
+/// A window that is linked to a report (`UReportDoc::SetReportWindow`) is owned by it; any other by whoever made it. It
+/// lives on while it is closed, and can be created again.
+class KAREPORT_EXPORT UReportWindowDlg : public CPropertyPane,
+                                         public kareport::ReportWindow,
+                                         public kareport::CommandTarget
+{
+public:
+    UReportWindowDlg();
+    ~UReportWindowDlg() override;
+
+    // --- Window -----------------------------------------------------------------------------------------------------
+
+    /// Creates the window at the left of the main frame and shows it. One that is there already stays as it is.
+    /// @param title         an empty one leaves the caption empty
+    /// @param previousView  the view that was active before; null for none
+    /// @return false, with no window, when there is no main frame
+    bool Create(const QString &title, UView *previousView);
+    bool createDocked(const QString &caption, UView *previousView) override;
+    bool isCreated() const override { return !body_.isNull(); }
+    /// Prepares the window that was just created: translates its texts, not active. @return 0
+    long HandleInitDialog();
+    /// Places the bar on top and the list under it. @param type  not looked at
+    void OnSize(unsigned type, int cx, int cy);
+    void showBar(bool show) override;
+    /// Closes the window, which can be created again: its lines are gone.
+    void ClosePane() override;
+    void OnSysCommand(unsigned command, long parameter) override;
+    /// The window never stands among the documents as a tab.
+    bool CanBeTabbedDocument() const override { return false; }
+    CViewPane *GetOwningPane() override { return isCreated() ? this : nullptr; }
+    /// Ends what the previous view is in the middle of when the Escape key comes, pressed or released, to whatever in the
+    /// window has the keyboard. @return whether it did, and the key is used up
+    bool PreTranslateMessage(QEvent *event);
+
+    // --- Content ----------------------------------------------------------------------------------------------------
+
+    /// Links the report that the window shows, which may be null; the list gets its font.
+    void SetReportDoc(UReportDoc *report);
+    /// The report; null when there is none or it has gone.
+    UReportDoc *GetReportDoc() const;
+    /// Adds a line exactly as it is and makes it the current one. Nothing while the window is not created.
+    void WriteLine(const QString &line) override;
+    /// Adds the lines of the report's text: without the blanks they begin with, and without empty ones. Lines that the list
+    /// has stay.
+    void UpdateDocumentData();
+    /// The list, and the bar, of a window that is created; else null.
+    UReportList *GetList() const;
+    CReportToolBar *GetToolBar() const;
+
+    // --- Commands ---------------------------------------------------------------------------------------------------
+
+    void setActive(bool active) override;
+    bool IsActive() const { return active_; }
+    void takeFocus() override;
+    /// The view to go back to; null for none or when it has gone.
+    UView *GetPreviousView() const { return previousView_.get(); }
+    /// Brings the pane of that view to the front.
+    void ActivatePreviousView();
+
+    /// Asks for a file and saves the report there. A save that fails leaves the report modified.
+    void OnSave();
+    /// Closes the window and prints the report from a view of its own.
+    void OnPrint();
+    void OnShowReport() { ShowReport(); }
+    /// Closes the window and opens the report in its view or in the user's preferred editor.
+    void ShowReport();
+    /// Closes the window; when the report is modified, after asking whether to save it.
+    void OnPressCloseButton();
+
+    void OnUpdateSave(kareport::CommandState &state);
+    void OnUpdatePrint(kareport::CommandState &state);
+    void OnUpdateShowReport(kareport::CommandState &state);
+    const std::vector<kareport::Command> &commands() const override { return commands_; }
+
+private:
+    bool createAt(Qt::DockWidgetArea area, const QString &title, UView *previousView);
+    void leaveForReport();
+    void updateCommands();
+
+    QPointer<kareport::ReportWindowBody> body_; ///< null while the window is not created
+    std::vector<kareport::Command> commands_;
+    UReportDoc *report_ = nullptr; ///< may have gone
+    kareport::RememberedView previousView_;
+    bool active_ = false;
+    QObject life_; ///< to see whether a question to the user has outlasted the window
+};

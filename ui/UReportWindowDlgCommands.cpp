@@ -1,0 +1,171 @@
+#include "UReportWindowDlg.h"
+
+#include "AppMessageBox.h"
+#include "CViewPane.h"
+#include "Folders.h"
+#include "ReportEntry.h"
+#include "SaveDialog.h"
+#include "StandardText.h"
+#include "UDocTemplate.h"
+#include "UReportDoc.h"
+#include "UReportView.h"
+#include "Xlate.h"
+
+#include <algorithm>
+
+namespace
+{
+
+const QString lastFolderEntry = QStringLiteral("LastOpenDirectoryReport");
+
+UReportView *firstReportView(const UReportDoc &report)
+{
+    for (UView *view : report.GetViews()) {
+        if (auto *reportView = dynamic_cast<UReportView *>(view)) {
+            return reportView;
+        }
+    }
+    return nullptr;
+}
+
+/// Closes the panes of a report that were never shown: it now stands in one that is.
+void closeHiddenPanes(const UReportDoc &report, const CViewPane *shown)
+{
+    const std::vector<UView *> views = report.GetViews();
+    for (const UView *view : views) {
+        if (std::find(report.GetViews().begin(), report.GetViews().end(), view) == report.GetViews().end()) {
+            continue; // it has gone with a pane that was closed before
+        }
+        CViewPane *pane = view->GetParentPane();
+        if (pane != nullptr && pane != shown && !pane->IsVisible()) {
+            pane->ClosePane();
+        }
+    }
+}
+
+} // namespace
+
+void UReportWindowDlg::OnUpdateSave(kareport::CommandState &state)
+{
+    SetCaptionState(active_ ? captionHighlighted : captionPlain);
+    const UReportDoc *report = GetReportDoc();
+    state.enabled = active_ && report != nullptr && report->IsModified();
+}
+
+void UReportWindowDlg::OnUpdatePrint(kareport::CommandState &state)
+{
+    state.enabled = active_ && GetReportDoc() != nullptr;
+}
+
+void UReportWindowDlg::OnUpdateShowReport(kareport::CommandState &state)
+{
+    OnUpdatePrint(state);
+}
+
+void UReportWindowDlg::OnSave()
+{
+    UReportDoc *report = GetReportDoc();
+    if (report == nullptr) {
+        return;
+    }
+    kareport::SaveRequest request;
+    request.defaultExtension = QStringLiteral("rep");
+    request.initialFolder = GetInitialOpenDir(lastFolderEntry);
+    request.filter = Xlate("Report Files (*.rep)|*.rep|RTF Files (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|") +
+                     kareport::standardText(kareport::allFilesTitle) + QStringLiteral("|*.*||");
+    request.flags = kareport::SaveRequest::overwritePrompt | kareport::SaveRequest::hideReadOnly |
+                    kareport::SaveRequest::pathMustExist;
+    const auto path = kareport::askSaveName(request);
+    if (!path) {
+        return;
+    }
+    SetLastOpenDir(*path, lastFolderEntry);
+    // The report may have been closed while the dialog was open, or by what its views do when it is saved.
+    if (UReportDoc::IsReportAvailable(report) && report->OnSaveDocument(*path) && UReportDoc::IsReportAvailable(report))
+    {
+        report->SetModifiedFlag(false);
+    }
+}
+
+void UReportWindowDlg::leaveForReport()
+{
+    UReportDoc::ShowReportBar(this, false);
+    ClosePane();
+    previousView_.reactivate();
+}
+
+void UReportWindowDlg::OnPrint()
+{
+    UReportDoc *report = GetReportDoc();
+    if (report == nullptr) {
+        return;
+    }
+    leaveForReport();
+    // The report is to open in the application, to be printed from there.
+    const bool externalEditor = report->GetExternalEditorFlag();
+    report->SetExternalEditorFlag(false);
+    UDocTemplate *reportTemplate = GetReportTemplate();
+    if (reportTemplate == nullptr) {
+        return; // with the flag cleared: without its template the report has no editor to go to either
+    }
+    if (CViewPane *pane = reportTemplate->CreateNewPane(report, nullptr, UReportDoc::ownPaneStyle, nullptr)) {
+        reportTemplate->InitialUpdatePane(pane, report, 0);
+    }
+    report->UpdateAllViews(nullptr, 0, nullptr);
+    // Views that are updated, and the user who prints, may close the report, and this window with it.
+    UReportView *view = UReportDoc::IsReportAvailable(report) ? firstReportView(*report) : nullptr;
+    if (view != nullptr) {
+        view->UpdateData(true);
+        view->OnReportPrint();
+    }
+    if (UReportDoc::IsReportAvailable(report)) {
+        report->SetExternalEditorFlag(externalEditor);
+    }
+}
+
+void UReportWindowDlg::ShowReport()
+{
+    UReportDoc *report = GetReportDoc();
+    if (report == nullptr) {
+        return;
+    }
+    leaveForReport();
+    if (!report->UsePreferredReportEditor()) {
+        UDocTemplate *reportTemplate = GetReportTemplate();
+        if (reportTemplate == nullptr) {
+            return;
+        }
+        if (CViewPane *pane = reportTemplate->CreateNewPane(report, nullptr, UReportDoc::ownPaneStyle, nullptr)) {
+            reportTemplate->InitialUpdatePane(pane, report, 1);
+            closeHiddenPanes(*report, pane);
+        }
+    }
+    report->UpdateAllViews(nullptr, 0, nullptr);
+}
+
+void UReportWindowDlg::OnPressCloseButton()
+{
+    const QPointer<QObject> alive(&life_);
+    const UReportDoc *report = GetReportDoc();
+    if (report != nullptr && report->IsModified()) {
+        QString question = Xlate("Save changes");
+        if (!GetWindowTextW().isEmpty()) {
+            question += u' ' + Xlate("to") + u' ' + GetWindowTextW();
+        }
+        question += u'?';
+        if (kareport::showMessage({question, QString(), MessageButtons::YesNo, kareport::MessageIcon::Question}) ==
+                MessageAnswer::Yes &&
+            alive)
+        {
+            OnSave();
+        }
+        if (!alive) {
+            return; // the report was closed meanwhile, and this window with it
+        }
+    }
+    if (GetReportDoc() != nullptr) {
+        UReportDoc::ShowReportBar(this, false);
+    }
+    ClosePane();
+    previousView_.reactivate();
+}
