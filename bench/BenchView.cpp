@@ -1,9 +1,9 @@
+#include "BenchApplication.h"
 #include "ReportEdit.h"
 #include "UReportDoc.h"
 #include "UReportView.h"
 
 #include "DefaultPrinter.h"
-#include "Profile.h"
 
 #include <QApplication>
 #include <QKeyEvent>
@@ -22,19 +22,6 @@
 
 namespace
 {
-
-/// Windows need an application, which the first of these benchmarks makes.
-void needApplication()
-{
-    static char name[] = "ka_bench";
-    static char *arguments[] = {name, nullptr};
-    static int count = 1;
-    if (QCoreApplication::instance() == nullptr) {
-        qputenv("QT_QPA_PLATFORM", "offscreen");
-        new QApplication(count, arguments); // as long as the program
-    }
-    kareport::setProfileStore(kareport::makeMemoryProfile());
-}
 
 QString reportOfLines(qint64 lines, QStringView lineEnd)
 {

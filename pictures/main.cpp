@@ -84,6 +84,7 @@ void takeDesk(Pictures &pictures, const QString &examples)
         pictures.take(*window->GetDock(), "report-window-floating");
         window->ShowReport();
     }
+    frame.SetActiveViewForFrameAndPane(report->GetViews().front());
     pictures.take(frame, "desk-report");
     for (QAction *menu : frame.menuBar()->actions()) {
         menu->menu()->popup(QPoint());

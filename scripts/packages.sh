@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # Installs the Debian packages that a task needs and that are not there yet.
 #
-#   scripts/packages.sh build|test|package|office|bench|tidy|coverage [...]
+#   scripts/packages.sh build|test|docs|package|office|bench|tidy|coverage [...]
 #
 # Every package stands here once, with the reason for it. Nothing is asked of apt when all are installed.
 set -euo pipefail
@@ -31,6 +31,9 @@ packages_test=(
     fonts-liberation2       # a second fixed-pitch face
     fonts-wqy-zenhei        # a face with CJK
     qt6-translations-l10n   # Qt's own texts in other languages
+)
+packages_docs=(
+    doxygen                 # the pages of the public headers
 )
 packages_package=(
     dpkg-dev file           # Debian packages and what they depend on

@@ -113,6 +113,9 @@ TEST(DeskFrame, AJobRunsIntoAReportWindow)
     EXPECT_EQ(std::count_if(docks.begin(), docks.end(), [](const QDockWidget *dock) { return !dock->isHidden(); }), 1)
         << "the report stands in one pane";
     EXPECT_FALSE(window->isCreated());
+    ASSERT_TRUE(QTest::qWaitFor([&desk] { return desk.frame->GetActiveView() != nullptr; }))
+        << "commands are for what is there";
+    EXPECT_EQ(desk.frame->GetActiveView()->GetDocument(), report);
     // Closing that pane closes the report.
     dynamic_cast<COneViewPane *>(report->GetViews().front()->GetParentPane())->OnSysCommand(COneViewPane::scClose, 0);
     EXPECT_FALSE(UReportDoc::IsReportAvailable(report));

@@ -12,6 +12,7 @@
 #include "UView.h"
 #include "Xlate.h"
 
+#include <QApplication>
 #include <QCloseEvent>
 #include <QDragEnterEvent>
 #include <QFileDialog>
@@ -82,7 +83,10 @@ DeskFrame::DeskFrame() : files_([this](const QString &path) { fileChanged(path);
     UpdateCommands();
     constexpr int lookInterval = 500; // milliseconds
     auto *looking = new QTimer(this);
-    connect(looking, &QTimer::timeout, this, [] { closeUnseen(); });
+    connect(looking, &QTimer::timeout, this, [this] {
+        closeUnseen();
+        activateSomeView();
+    });
     looking->start(lookInterval);
     constexpr int keepInterval = 5000; // milliseconds
     auto *timer = new QTimer(this);
@@ -109,6 +113,30 @@ void DeskFrame::activate(UDocument *report)
     UApplication::Get()->SetCurrentReport(report);
     if (!report->GetViews().empty()) {
         SetActiveViewForFrameAndPane(report->GetViews().front());
+    }
+}
+
+void DeskFrame::activateSomeView()
+{
+    // Commands are for the view with the keyboard: another window of the same report, or the only one that is left.
+    const QWidget *focus = QApplication::focusWidget();
+    UView *last = nullptr;
+    for (const UDocument *document : openDocuments()) {
+        for (UView *view : document->GetViews()) {
+            if (!view->IsVisible() || view->GetWidget() == nullptr) {
+                continue;
+            }
+            const bool hasFocus = focus != nullptr && view->GetWidget()->isAncestorOf(focus);
+            if (hasFocus && view != GetActiveView()) {
+                SetActiveViewForFrameAndPane(view);
+                return;
+            }
+            last = view;
+        }
+    }
+    if (GetActiveView() == nullptr && last != nullptr) {
+        activate(last->GetDocument());
+        SetActiveViewForFrameAndPane(last);
     }
 }
 

@@ -60,6 +60,7 @@ private:
     void askPreferences();
     bool finishOpening(UDocument *report, const QString &error);
     void activate(UDocument *report);
+    void activateSomeView();
     void fileChanged(const QString &path);
 
     void newWindow();

@@ -18,6 +18,9 @@ const QString geometryEntry = QStringLiteral("Window Geometry");
 void DeskFrame::newWindow()
 {
     UDocument *document = activeDocument();
+    if (document == nullptr) {
+        return;
+    }
     if (CViewPane *pane = GetReportTemplate()->CreateNewPane(document, nullptr, 0, nullptr)) {
         GetReportTemplate()->InitialUpdatePane(pane, document, 1);
     }
