@@ -18,11 +18,13 @@
 #include <QApplication>
 #include <QCommandLineParser>
 #include <QDir>
+#include <QEventLoop>
 #include <QLineEdit>
 #include <QMenu>
 #include <QMenuBar>
 #include <QStyleFactory>
 #include <QTabWidget>
+#include <QTimer>
 #include <QToolBar>
 
 #include <cstdio>
@@ -57,8 +59,11 @@ public:
     void take(QWidget &window, const char *name)
     {
         window.show();
-        QCoreApplication::processEvents();
-        QCoreApplication::sendPostedEvents();
+        // Lines of a report window are shown a moment after they were written.
+        constexpr int moment = 150; // milliseconds
+        QEventLoop wait;
+        QTimer::singleShot(moment, &wait, &QEventLoop::quit);
+        wait.exec();
         const QString path = QDir(folder_).filePath(QString::fromLatin1(name) + suffix_ + QStringLiteral(".png"));
         isWritten_ = window.grab().save(path) && isWritten_;
         std::printf("%s\n", qPrintable(path));
