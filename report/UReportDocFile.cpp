@@ -1,5 +1,6 @@
 #include "UReportDoc.h"
 
+#include "AppMessageBox.h"
 #include "EditedText.h"
 #include "FileExtension.h"
 #include "Folders.h"
@@ -69,6 +70,7 @@ UDocument *openDocument(const void *pointer)
 
 bool UReportDoc::DoSave(const QString &path, bool replace)
 {
+    bool isSaved = false;
     QString name = path;
     if (path.isEmpty() || replace) {
         kareport::SaveRequest request;
@@ -87,8 +89,12 @@ bool UReportDoc::DoSave(const QString &path, bool replace)
         name = *chosen;
         SetLastOpenDir(name, lastFolderEntry);
     }
-    const kareport::WaitCursor cursor;
-    if (!OnSaveDocument(name)) {
+    {
+        const kareport::WaitCursor cursor;
+        isSaved = OnSaveDocument(name);
+    }
+    if (!isSaved) {
+        AppMessageBox(Xlate("\"%1\" could not be saved. Choose another folder, or make room on the disk.").arg(name));
         return false;
     }
     if (replace) {

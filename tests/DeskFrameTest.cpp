@@ -5,6 +5,7 @@
 #include "DeskCommandIds.h"
 #include "DeskPreferences.h"
 #include "ReportEdit.h"
+#include "SavedReports.h"
 #include "UApplication.h"
 #include "UReportList.h"
 #include "UReportView.h"
@@ -135,6 +136,42 @@ TEST(DeskFrame, AReportWhoseWindowIsClosedCloses)
     EXPECT_TRUE(QTest::qWaitFor([report] { return !UReportDoc::IsReportAvailable(report); }))
         << "nobody could ever see it again";
     EXPECT_EQ(desk.messages.size(), 1) << "asked once";
+}
+
+TEST(DeskFrame, AReportThatCouldNotBeSavedIsNotThrownAwayWithItsWindow)
+{
+    Desk desk;
+    const JobFolder folder;
+    folder.put("a.json", lineJob());
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.json")));
+    UReportDoc *report = Desk::reports().front();
+    desk.answer = MessageAnswer::Yes; // but no name is given
+    dynamic_cast<UReportWindowDlg *>(report->GetReportWindow())->OnPressCloseButton();
+    EXPECT_TRUE(QTest::qWaitFor([report] { return !UReportDoc::IsReportAvailable(report) || report->IsShown(); }));
+    ASSERT_TRUE(UReportDoc::IsReportAvailable(report)) << "it comes back in its pane";
+    EXPECT_TRUE(report->IsModified());
+    desk.answer = MessageAnswer::No;
+}
+
+TEST(DeskFrame, AFileThatIsOpenIsNotOpenedTwice)
+{
+    Desk desk;
+    const JobFolder folder;
+    folder.put("a.rep", savedText("TALVEN"));
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.rep")));
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("./a.rep")));
+    EXPECT_EQ(Desk::reports().size(), 1U) << "two of them would overwrite each other";
+}
+
+TEST(DeskFrame, AFileThatCannotBeReadAgainLeavesTheReportAsItIs)
+{
+    Desk desk;
+    const JobFolder folder;
+    folder.put("a.rep", savedText("TALVEN"));
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.rep")));
+    QFile::remove(folder.path("a.rep"));
+    EXPECT_FALSE(kareport::reloadSavedReport(*Desk::reports().front()));
+    EXPECT_EQ(Desk::textOf(*Desk::reports().front()), QStringLiteral("TALVEN\n"));
 }
 
 TEST(DeskFrame, TwoJobsOfOneTitleHaveTitlesOfTheirOwn)

@@ -275,6 +275,11 @@
         <translation>Berichtsdateien (*.rep)|*.rep|RTF-Dateien (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|</translation>
     </message>
     <message>
+        <location filename="../report/UReportDocFile.cpp"/>
+        <source>"%1" could not be saved. Choose another folder, or make room on the disk.</source>
+        <translation>„%1“ konnte nicht gespeichert werden. Einen anderen Ordner wählen oder Platz auf dem Datenträger schaffen.</translation>
+    </message>
+    <message>
         <location filename="../view/FindBar.cpp"/>
         <source>Previous match</source>
         <translation>Vorherige Fundstelle</translation>
@@ -1134,6 +1139,15 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
+        <source>These reports could not be opened again:
+
+%1</source>
+        <translation>Diese Berichte konnten nicht wieder geöffnet werden:
+
+%1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>"%1" was changed by another program, and it has changes here that are not saved. Load it again and lose the changes made here?</source>
         <translation>„%1“ wurde von einem anderen Programm geändert, und hier gibt es Änderungen, die nicht gespeichert sind. Neu laden und die hier gemachten Änderungen verwerfen?</translation>
     </message>
@@ -1362,6 +1376,11 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
         <translation>Symbolleiste</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/EditorHold.cpp"/>
+        <source>"%1" could not be started. Choose another program under Preferences.</source>
+        <translation>„%1“ konnte nicht gestartet werden. In den Einstellungen ein anderes Programm wählen.</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>&amp;Show reports in this program:</source>
         <translation>&amp;Berichte in diesem Programm anzeigen:</translation>
@@ -1410,6 +1429,11 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>It gets reports as plain text.</source>
         <translation>Es erhält Berichte als reinen Text.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
+        <source>Another job is running. Wait for its end, or cancel it.</source>
+        <translation>Ein anderer Auftrag läuft gerade. Sein Ende abwarten oder ihn abbrechen.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>

@@ -275,6 +275,11 @@
         <translation>帳票ファイル (*.rep)|*.rep|RTF ファイル (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|</translation>
     </message>
     <message>
+        <location filename="../report/UReportDocFile.cpp"/>
+        <source>"%1" could not be saved. Choose another folder, or make room on the disk.</source>
+        <translation>「%1」を保存できませんでした。別のフォルダーを選ぶか、ディスクの空き容量を増やしてください。</translation>
+    </message>
+    <message>
         <location filename="../view/FindBar.cpp"/>
         <source>Previous match</source>
         <translation>前の一致箇所</translation>
@@ -1134,6 +1139,15 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
+        <source>These reports could not be opened again:
+
+%1</source>
+        <translation>次の帳票を開き直せませんでした:
+
+%1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>"%1" was changed by another program, and it has changes here that are not saved. Load it again and lose the changes made here?</source>
         <translation>「%1」は別のプログラムで変更されましたが、ここにも未保存の変更があります。再読み込みして、ここでの変更を破棄しますか?</translation>
     </message>
@@ -1362,6 +1376,11 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
         <translation>ツールバー</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/EditorHold.cpp"/>
+        <source>"%1" could not be started. Choose another program under Preferences.</source>
+        <translation>「%1」を起動できませんでした。設定で別のプログラムを選んでください。</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>&amp;Show reports in this program:</source>
         <translation>帳票をこのプログラムで表示(&amp;S):</translation>
@@ -1410,6 +1429,11 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>It gets reports as plain text.</source>
         <translation>帳票はプレーンテキストで渡されます。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
+        <source>Another job is running. Wait for its end, or cancel it.</source>
+        <translation>別のジョブが実行中です。終了を待つか、中止してください。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>

@@ -101,6 +101,7 @@ bool UReportWindowDlg::createAt(Qt::DockWidgetArea area, const QString &title, U
 
 long UReportWindowDlg::HandleInitDialog()
 {
+    givenUp_ = false;
     if (body_) {
         body_->list().setAccessibleName(Xlate("Report lines"));
     }

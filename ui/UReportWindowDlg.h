@@ -74,6 +74,8 @@ public:
 
     void setActive(bool active) override;
     bool IsActive() const { return active_; }
+    /// Whether the user has closed the window and answered that the report is not to be saved.
+    bool IsGivenUp() const { return givenUp_; }
     void takeFocus() override;
     /// The view to go back to; null for none or when it has gone.
     UView *GetPreviousView() const { return previousView_.get(); }
@@ -105,5 +107,6 @@ private:
     UReportDoc *report_ = nullptr; ///< may have gone
     kareport::RememberedView previousView_;
     bool active_ = false;
+    bool givenUp_ = false;
     QObject life_; ///< to see whether a question to the user has outlasted the window
 };

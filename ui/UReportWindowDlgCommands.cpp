@@ -81,8 +81,15 @@ void UReportWindowDlg::OnSave()
     }
     SetLastOpenDir(*path, lastFolderEntry);
     // The report may have been closed while the dialog was open, or by what its views do when it is saved.
-    if (UReportDoc::IsReportAvailable(report) && report->OnSaveDocument(*path) && UReportDoc::IsReportAvailable(report))
-    {
+    if (!UReportDoc::IsReportAvailable(report)) {
+        return;
+    }
+    const bool isSaved = report->OnSaveDocument(*path);
+    if (!isSaved) {
+        kareport::showMessage(
+            {Xlate("\"%1\" could not be saved. Choose another folder, or make room on the disk.").arg(*path), QString(),
+             MessageButtons::Ok, kareport::MessageIcon::None});
+    } else if (UReportDoc::IsReportAvailable(report)) {
         report->SetModifiedFlag(false);
     }
 }
@@ -153,15 +160,15 @@ void UReportWindowDlg::OnPressCloseButton()
             question += u' ' + Xlate("to") + u' ' + GetWindowTextW();
         }
         question += u'?';
-        if (kareport::showMessage({question, QString(), MessageButtons::YesNo, kareport::MessageIcon::Question}) ==
-                MessageAnswer::Yes &&
-            alive)
-        {
+        const MessageAnswer answer =
+            kareport::showMessage({question, QString(), MessageButtons::YesNo, kareport::MessageIcon::Question});
+        if (answer == MessageAnswer::Yes && alive) {
             OnSave();
         }
         if (!alive) {
             return; // the report was closed meanwhile, and this window with it
         }
+        givenUp_ = answer == MessageAnswer::No;
     }
     if (GetReportDoc() != nullptr) {
         UReportDoc::ShowReportBar(this, false);

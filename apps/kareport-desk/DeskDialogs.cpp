@@ -7,6 +7,7 @@
 #include <QCoreApplication>
 #include <QFileDialog>
 #include <QMessageBox>
+#include <QPushButton>
 
 namespace kareport
 {
@@ -33,6 +34,12 @@ MessageAnswer showBox(QWidget *parent, const Message &message)
                 : isQuestion                             ? QMessageBox::Question
                                                          : QMessageBox::Warning);
     box.setStandardButtons(boxButtons(message.buttons));
+    if (message.buttons == MessageButtons::YesNo) {
+        // The Escape key is no answer, least of all one that throws something away.
+        QPushButton *none = box.addButton(QMessageBox::Cancel);
+        none->hide();
+        box.setEscapeButton(none);
+    }
     switch (box.exec()) {
     case QMessageBox::Ok: return MessageAnswer::Ok;
     case QMessageBox::Yes: return MessageAnswer::Yes;

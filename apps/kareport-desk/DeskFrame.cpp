@@ -9,11 +9,13 @@
 #include "TemplateDialog.h"
 #include "UApplication.h"
 #include "UReportDoc.h"
+#include "UReportWindowDlg.h"
 #include "UView.h"
 #include "Xlate.h"
 
 #include <QApplication>
 #include <QCloseEvent>
+#include <QDir>
 #include <QDragEnterEvent>
 #include <QFileDialog>
 #include <QFileInfo>
@@ -42,14 +44,32 @@ bool isOpen(const UDocument *document)
     return std::find(documents.begin(), documents.end(), document) != documents.end();
 }
 
+/// The open document of a file; null when there is none.
+UDocument *documentOf(const QString &path)
+{
+    for (UDocument *document : openDocuments()) {
+        if (document->GetPathName() == path) {
+            return document;
+        }
+    }
+    return nullptr;
+}
+
 /// Closes reports that nobody can see or close any more, as after their window was closed. What an editor outside holds is
 /// hidden on purpose.
 void closeUnseen()
 {
     for (UDocument *document : openDocuments()) {
-        const auto *report = dynamic_cast<UReportDoc *>(document);
-        if (report != nullptr && isOpen(document) && !report->GetExternalEditorFlag() && !report->IsShown()) {
-            document->OnCloseDocument();
+        auto *report = isOpen(document) ? dynamic_cast<UReportDoc *>(document) : nullptr;
+        // A document that must not delete itself is in the middle of being opened.
+        if (report == nullptr || report->GetExternalEditorFlag() || report->IsShown() || !report->IsAutoDelete()) {
+            continue;
+        }
+        const auto *window = dynamic_cast<UReportWindowDlg *>(report->GetReportWindow());
+        if (!report->IsModified() || (window != nullptr && window->IsGivenUp())) {
+            report->OnCloseDocument();
+        } else if (CViewPane *pane = report->GetFrameWindow()) {
+            pane->ShowPane(true); // what is not saved is not thrown away: closing this pane asks again
         }
     }
 }
@@ -198,8 +218,14 @@ bool DeskFrame::OpenFile(const QString &path)
     } else if (!QFileInfo(path).isFile()) {
         error = Xlate("There is no file \"%1\".").arg(path);
     } else {
-        const QString file = QFileInfo(path).absoluteFilePath();
-        report = kareport::openSavedReport(file);
+        const QString file = QDir::cleanPath(QFileInfo(path).absoluteFilePath());
+        report = documentOf(file);
+        if (report != nullptr && !report->GetViews().empty() && report->GetViews().front()->GetParentPane() != nullptr)
+        {
+            report->GetViews().front()->GetParentPane()->ShowPane(true); // it is open already
+        } else {
+            report = kareport::openSavedReport(file);
+        }
         error = report == nullptr ? Xlate("\"%1\" could not be opened.").arg(path) : QString();
     }
     return finishOpening(report, error);
@@ -220,14 +246,23 @@ void DeskFrame::OfferLeftReports()
         if (answer == MessageAnswer::Cancel) {
             return; // they are offered again at the next start
         }
+        QStringList lost;
         for (const kareport::KeptReport &kept : left) {
             if (answer == MessageAnswer::Yes) {
                 if (UReportDoc *report = kareport::Recovery::reopen(kept)) {
                     activate(report);
+                } else {
+                    lost.append(kept.title.isEmpty() ? kept.path : kept.title);
                 }
             }
         }
-        recovery_.keep();
+        if (!lost.isEmpty()) {
+            kareport::showMessage({Xlate("These reports could not be opened again:\n\n%1").arg(lost.join(u'\n')),
+                                   QString(), MessageButtons::Ok, kareport::MessageIcon::Information});
+        }
+        if (!recovery_.keep()) {
+            return; // a full disk: what was left stays where it is
+        }
     }
     recovery_.discardLeft();
 }
@@ -235,15 +270,19 @@ void DeskFrame::OfferLeftReports()
 void DeskFrame::NoteDocumentEvent(UDocument &document, UDocument::DocumentEvent event)
 {
     if (event == UDocument::DocumentEvent::AfterCloseDocument) {
-        files_.forget(document.GetPathName());
         recovery_.forget(dynamic_cast<const UReportDoc *>(&document));
-        return;
     }
     // A document that has just been opened or saved under a new name gets its path behind the event.
     QMetaObject::invokeMethod(
         this,
-        [this, &document] {
-            if (isOpen(&document) && !document.GetPathName().isEmpty()) {
+        [this, event, &document] {
+            QStringList paths;
+            for (const UDocument *open : openDocuments()) {
+                paths.append(open->GetPathName());
+            }
+            files_.retain(paths);
+            const bool isClosed = event == UDocument::DocumentEvent::AfterCloseDocument;
+            if (!isClosed && isOpen(&document) && !document.GetPathName().isEmpty()) {
                 files_.watch(document.GetPathName());
             }
         },
@@ -284,6 +323,10 @@ void DeskFrame::about()
 
 void DeskFrame::closeEvent(QCloseEvent *event)
 {
+    if (kareport::isJobRunning()) {
+        event->ignore();
+        return;
+    }
     for (UDocument *document : openDocuments()) {
         if (isOpen(document) && !document->SaveModified()) {
             event->ignore();

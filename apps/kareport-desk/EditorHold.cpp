@@ -1,9 +1,11 @@
 #include "EditorHold.h"
 
+#include "AppMessageBox.h"
 #include "DeskPreferences.h"
 #include "EditorLauncher.h"
 #include "ProcessState.h"
 #include "UReportDoc.h"
+#include "Xlate.h"
 
 #include <QProcess>
 
@@ -15,7 +17,20 @@ namespace kareport
 namespace
 {
 constexpr int lookInterval = 500; // milliseconds
+
+/// Shows a report that an editor does not show.
+void showInstead(UReportDoc *report, const QString &program)
+{
+    if (UReportDoc::IsReportAvailable(report)) {
+        report->SetExternalEditorFlag(false);
+        report->SetModifiedFlag(true); // it is saved nowhere but in a temporary file
+        report->UpdateAllViews(nullptr, 0, nullptr);
+    }
+    showMessage({Xlate("\"%1\" could not be started. Choose another program under Preferences.").arg(program),
+                 QString(), MessageButtons::Ok, MessageIcon::None});
 }
+
+} // namespace
 
 EditorHold::EditorHold()
 {
@@ -32,10 +47,11 @@ EditorHold::~EditorHold()
 void EditorHold::start(const EditorLaunch &launch)
 {
     qint64 process = 0;
+    auto *report = dynamic_cast<UReportDoc *>(launch.document);
     if (!QProcess::startDetached(launch.program, {launch.file}, launch.folder, &process)) {
+        QTimer::singleShot(0, &timer_, [report, program = launch.program] { showInstead(report, program); });
         return;
     }
-    auto *report = dynamic_cast<UReportDoc *>(launch.document);
     if (report != nullptr && loadPreferences().keepsForEditor) {
         report->EnableCloseOption(false);
         held_.push_back({report, process});
@@ -45,8 +61,9 @@ void EditorHold::start(const EditorLaunch &launch)
 
 void EditorHold::look()
 {
-    const auto ended = std::stable_partition(held_.begin(), held_.end(),
-                                             [](const Held &held) { return isProcessRunning(held.process); });
+    const auto ended = std::stable_partition(held_.begin(), held_.end(), [](const Held &held) {
+        return isProcessRunning(held.process) && UReportDoc::IsReportAvailable(held.report);
+    });
     const std::vector<Held> released(ended, held_.end());
     held_.erase(ended, held_.end());
     for (const Held &held : released) {

@@ -39,6 +39,15 @@ void FileWatch::forget(const QString &path)
     }
 }
 
+void FileWatch::retain(const QStringList &paths)
+{
+    for (const QString &path : known_.keys()) {
+        if (!paths.contains(path)) {
+            forget(path);
+        }
+    }
+}
+
 void FileWatch::check()
 {
     QStringList changed;

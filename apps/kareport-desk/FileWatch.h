@@ -21,6 +21,8 @@ public:
     /// Watches a file, as it is now: what it holds was read or written by this program.
     void watch(const QString &path);
     void forget(const QString &path);
+    /// Forgets all files but these.
+    void retain(const QStringList &paths);
 
 private:
     /// What tells one content of a file from another without reading it.

@@ -11,9 +11,12 @@
 #include "Xlate.h"
 
 #include <QCoreApplication>
+#include <QElapsedTimer>
 #include <QFileInfo>
 #include <QProgressDialog>
+#include <QScopedValueRollback>
 
+#include <climits>
 #include <new>
 
 namespace kareport
@@ -29,7 +32,12 @@ public:
     explicit DialogProgress(QWidget *parent) : Progress(true), dialog_(QString(), Xlate("Cancel"), 0, 100, parent)
     {
         dialog_.setWindowModality(Qt::ApplicationModal);
-        dialog_.setMinimumDuration(500);
+        // Only this class says when it comes and goes: while it is not there, nothing keeps the user from other windows.
+        dialog_.setMinimumDuration(INT_MAX);
+        dialog_.setAutoReset(false);
+        dialog_.setAutoClose(false);
+        dialog_.reset();
+        sinceStart_.start();
         QObject::connect(&dialog_, &QProgressDialog::canceled, &dialog_, [] { setInterrupted(true); });
     }
 
@@ -38,7 +46,13 @@ public:
 protected:
     void show(std::size_t done) override
     {
+        constexpr qint64 shortWork = 500; // milliseconds
+        if (sinceStart_.elapsed() < shortWork) {
+            QCoreApplication::processEvents(QEventLoop::ExcludeUserInputEvents);
+            return;
+        }
         dialog_.setLabelText(what());
+        dialog_.show();
         dialog_.setRange(0, total() > 0 ? 100 : 0);
         dialog_.setValue(total() > 0 ? static_cast<int>(std::min(done, total()) * 100 / total()) : 0);
         QCoreApplication::processEvents();
@@ -46,7 +60,21 @@ protected:
 
 private:
     QProgressDialog dialog_;
+    QElapsedTimer sinceStart_;
 };
+
+bool &runningJob()
+{
+    static bool isRunning = false;
+    return isRunning;
+}
+
+void closeReport(UReportDoc *report)
+{
+    if (UReportDoc::IsReportAvailable(report)) {
+        report->OnCloseDocument();
+    }
+}
 
 CViewPane *paneOf(const UReportDoc &report)
 {
@@ -84,15 +112,21 @@ UReportDoc *runJob(Expected<JsonSource> read, QWidget *parent, QString &error)
     {
         const QString caption = job.title.value_or(QFileInfo(source.path()).completeBaseName());
         JobRunner runner(job, source, progress, [&caption](bool header) { return makeShown(header, caption); });
-        const auto wrong = runner.run();
+        std::optional<InputError> wrong;
+        try {
+            wrong = runner.run();
+        } catch (const std::bad_alloc &) {
+            closeReport(runner.madeReport()); // half a report is none
+            throw;
+        }
         report = runner.madeReport();
         if (wrong) {
             error = wrong->message();
         }
         isMade = !wrong && !isInterrupted();
     }
-    if (report != nullptr && !isMade) {
-        report->OnCloseDocument();
+    if (!isMade) {
+        closeReport(report);
         return nullptr;
     }
     if (report != nullptr) {
@@ -107,6 +141,11 @@ UReportDoc *runJob(Expected<JsonSource> read, QWidget *parent, QString &error)
 template <typename Read>
 UReportDoc *launch(const Read &read, QWidget *parent, QString &error)
 {
+    if (runningJob()) {
+        error = Xlate("Another job is running. Wait for its end, or cancel it.");
+        return nullptr;
+    }
+    const QScopedValueRollback<bool> running(runningJob(), true);
     setInterrupted(false);
     try {
         return runJob(read(), parent, error);
@@ -117,6 +156,11 @@ UReportDoc *launch(const Read &read, QWidget *parent, QString &error)
 }
 
 } // namespace
+
+bool isJobRunning()
+{
+    return runningJob();
+}
 
 UReportDoc *launchJob(const QString &path, QWidget *parent, QString &error)
 {

@@ -10,6 +10,9 @@ class UReportDoc;
 namespace kareport
 {
 
+/// Whether a job is running now: its report must not be closed.
+bool isJobRunning();
+
 /// Runs a job file in the application, with a window that shows progress and can stop it.
 /// @param error  receives what went wrong; empty when the job was stopped
 /// @return the report, shown in its pane; null when it was not made

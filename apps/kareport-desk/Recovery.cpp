@@ -5,6 +5,7 @@
 #include "SavedReports.h"
 #include "UReportDoc.h"
 #include "UReportView.h"
+#include "UReportWindowDlg.h"
 
 #include <QDir>
 #include <QFile>
@@ -144,8 +145,10 @@ UReportDoc *Recovery::reopen(const KeptReport &kept)
 QString Recovery::textFileOf(const UReportDoc &report)
 {
     Written &written = written_[&report];
-    if (written.edits == report.GetEditCount() && written.length == report.GetTextLength()) {
-        return written.file;
+    const auto *window = dynamic_cast<UReportWindowDlg *>(report.GetReportWindow());
+    const bool isBeingWritten = window != nullptr && window->isCreated() && !window->IsActive();
+    if (isBeingWritten || (written.edits == report.GetEditCount() && written.length == report.GetTextLength())) {
+        return written.length < 0 ? QString() : written.file;
     }
     if (written.file.isEmpty()) {
         written.file = QString::number(++lastNumber_);
@@ -159,18 +162,20 @@ QString Recovery::textFileOf(const UReportDoc &report)
         return device.write(bytes) == bytes.size();
     });
     if (!isWritten) {
-        return QString(); // a full disk: the next turn tries again
+        isComplete_ = false; // a full disk: the next turn tries again, and what was written before stays
+        return written.length < 0 ? QString() : written.file;
     }
     written.edits = report.GetEditCount();
     written.length = report.GetTextLength();
     return written.file;
 }
 
-void Recovery::keep()
+bool Recovery::keep()
 {
     if (folder_.isEmpty()) {
-        return;
+        return false;
     }
+    isComplete_ = true;
     for (const UReportDoc *report : closed_) {
         if (const QString file = written_.take(report).file; !file.isEmpty()) {
             gone_.append(file);
@@ -194,7 +199,10 @@ void Recovery::keep()
     }
     // Only then may texts go that the list named till now.
     const QByteArray bytes = QJsonDocument(list).toJson();
-    if (bytes != list_ && writeFile(QDir(folder_).filePath(listName), bytes)) {
+    if (bytes != list_) {
+        if (!writeFile(QDir(folder_).filePath(listName), bytes)) {
+            return false;
+        }
         list_ = bytes;
     }
     for (auto written = written_.cbegin(); written != written_.cend(); ++written) {
@@ -206,6 +214,7 @@ void Recovery::keep()
         QFile::remove(QDir(folder_).filePath(file));
     }
     written_ = kept;
+    return isComplete_;
 }
 
 } // namespace kareport

@@ -44,8 +44,9 @@ public:
     /// Throws away what crashed programs left.
     void discardLeft();
 
-    /// Writes down what is open now. Texts that have not changed since are not written again.
-    void keep();
+    /// Writes down what is open now. Texts that have not changed since are not written again, and those that are being
+    /// written by a job not yet. @return whether all of it is on the disk
+    bool keep();
     /// A report has been closed: what comes in its place in memory is another one.
     void forget(const UReportDoc *report) { closed_.insert(report); }
 
@@ -67,6 +68,7 @@ private:
     QStringList gone_;                ///< texts that are no longer needed
     QByteArray list_;                 ///< as it was written last
     int lastNumber_ = 0;
+    bool isComplete_ = true; ///< whether the last `keep` could write all texts
 };
 
 } // namespace kareport

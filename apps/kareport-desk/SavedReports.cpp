@@ -7,6 +7,8 @@
 #include "SavedText.h"
 #include "UReportDoc.h"
 
+#include <QFile>
+
 #include <optional>
 
 namespace kareport
@@ -62,6 +64,9 @@ UReportDoc *openSavedReport(const QString &path)
 
 bool reloadSavedReport(UReportDoc &report)
 {
+    if (!QFile(report.GetPathName()).open(QIODevice::ReadOnly)) {
+        return false; // what is shown is then all that there is
+    }
     if (const auto text = exactText(report.GetPathName())) {
         fill(report, *text);
         return true;

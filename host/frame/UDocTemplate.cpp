@@ -57,7 +57,7 @@ UDocument *UDocTemplate::OpenReportDocumentFile(const QString &path, int /*addTo
     document->SetAutoDelete(false);
     const bool filled = path.isEmpty() ? document->OnNewDocument() : document->OnOpenDocument(path);
     if (!filled) {
-        if (pane != nullptr && ownPane) {
+        if (CViewPane::IsOpen(pane) && ownPane) {
             pane->ClosePane();
         }
         while (!ownPane && !document->GetViews().empty()) {
@@ -70,7 +70,7 @@ UDocument *UDocTemplate::OpenReportDocumentFile(const QString &path, int /*addTo
     if (!path.isEmpty()) {
         document->SetPathName(path, true);
     }
-    if (pane != nullptr) {
+    if (CViewPane::IsOpen(pane)) {
         InitialUpdatePane(pane, document, makeVisible);
     }
     return document;
