@@ -22,6 +22,12 @@ QFont reportFont(const QString &name, unsigned points)
     return font;
 }
 
+QFont reportFont(const UReportDoc &report)
+{
+    constexpr qsizetype longestFaceName = 31;
+    return reportFont(report.GetFontName().left(longestFaceName), report.GetFontSize());
+}
+
 QString shownText(const UReportDoc &report)
 {
     if (!report.GetRTFDataFlag()) {

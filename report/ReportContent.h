@@ -15,6 +15,8 @@ namespace kareport
 
 /// The fixed-pitch font that a report is shown in.
 KAREPORT_EXPORT QFont reportFont(const QString &name, unsigned points);
+/// The font of a report's view: its face by the 31 characters that the name of a face has at most.
+KAREPORT_EXPORT QFont reportFont(const UReportDoc &report);
 
 /// The text that a view shows of a report: its rich text in rich-text mode, else its own.
 KAREPORT_EXPORT QString shownText(const UReportDoc &report);

@@ -10,13 +10,14 @@
 #include "PrivateFile.h"
 #include "Profile.h"
 #include "ReportEntry.h"
-#include "ReportViewPort.h"
+#include "ReportViews.h"
 #include "UView.h"
 
 #include <algorithm>
 #include <utility>
 
 using kareport::EditorKind;
+using kareport::showsReport;
 
 namespace
 {
@@ -43,11 +44,6 @@ void startEditor(const QString &editor, const QString &file, UDocument &report)
     if (!file.isEmpty()) {
         kareport::launchEditor(editor, file, GetTempDir(false), &report);
     }
-}
-
-bool showsReport(const UView *view)
-{
-    return dynamic_cast<const kareport::ReportViewPort *>(view) != nullptr;
 }
 
 /// Hands on the lines of a text without their LF, except those that hold nothing but a CR. That CR stays with its line.

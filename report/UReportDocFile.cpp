@@ -1,6 +1,5 @@
 #include "UReportDoc.h"
 
-#include "AppMessageBox.h"
 #include "EditedText.h"
 #include "FileExtension.h"
 #include "Folders.h"
@@ -8,10 +7,9 @@
 #include "PdfExport.h"
 #include "ReplaceFile.h"
 #include "ReportContent.h"
-#include "ReportViewPort.h"
+#include "ReportSaveName.h"
+#include "ReportViews.h"
 #include "RichTextReader.h"
-#include "SaveDialog.h"
-#include "StandardText.h"
 #include "TemporaryNames.h"
 #include "UApplication.h"
 #include "UView.h"
@@ -26,8 +24,6 @@
 namespace
 {
 
-const QString lastFolderEntry = QStringLiteral("LastOpenDirectoryReport");
-
 bool isRichTextName(const QString &name)
 {
     return kareport::endsWithExtension(name, u".rtf");
@@ -38,34 +34,6 @@ bool isPdfName(const QString &name)
     return kareport::endsWithExtension(name, u".pdf");
 }
 
-/// The views that show a report's text, in their order.
-std::vector<UView *> reportViews(const UReportDoc &report)
-{
-    std::vector<UView *> views;
-    for (UView *view : report.GetViews()) {
-        if (dynamic_cast<kareport::ReportViewPort *>(view) != nullptr) {
-            views.push_back(view);
-        }
-    }
-    return views;
-}
-
-/// The open document behind a pointer that may be stale; null when it is not open.
-UDocument *openDocument(const void *pointer)
-{
-    if (UApplication::Get() == nullptr) {
-        return nullptr;
-    }
-    for (const auto &docTemplate : UApplication::Get()->GetDocTemplates()) {
-        for (UDocument *document : docTemplate->GetDocuments()) {
-            if (document == pointer) {
-                return document;
-            }
-        }
-    }
-    return nullptr;
-}
-
 } // namespace
 
 bool UReportDoc::DoSave(const QString &path, bool replace)
@@ -73,28 +41,18 @@ bool UReportDoc::DoSave(const QString &path, bool replace)
     bool isSaved = false;
     QString name = path;
     if (path.isEmpty() || replace) {
-        kareport::SaveRequest request;
-        request.defaultExtension = QStringLiteral("rep");
-        request.initialFolder = GetInitialOpenDir(lastFolderEntry);
-        request.flags = kareport::SaveRequest::hideReadOnly | kareport::SaveRequest::overwritePrompt |
-                        kareport::SaveRequest::pathMustExist;
-        request.filter =
-            (openedFromRtf_ ? Xlate("RTF Files (*.rtf)|*.rtf|Report Files (*.rep)|*.rep|PDF (*.pdf)|*.pdf|")
-                            : Xlate("Report Files (*.rep)|*.rep|RTF Files (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|")) +
-            kareport::standardText(kareport::allFilesTitle) + QStringLiteral("|*.*||");
-        const auto chosen = kareport::askSaveName(request);
+        const auto chosen = kareport::askReportName(openedFromRtf_);
         if (!chosen) {
             return false;
         }
         name = *chosen;
-        SetLastOpenDir(name, lastFolderEntry);
     }
     {
         const kareport::WaitCursor cursor;
         isSaved = OnSaveDocument(name);
     }
     if (!isSaved) {
-        AppMessageBox(Xlate("\"%1\" could not be saved. Choose another folder, or make room on the disk.").arg(name));
+        kareport::sayNotSaved(name);
         return false;
     }
     if (replace) {
@@ -128,7 +86,7 @@ bool UReportDoc::saveByName(const QString &path)
 
 std::optional<bool> UReportDoc::saveViewAsRichText(const QString &path)
 {
-    for (UView *view : reportViews(*this)) {
+    for (UView *view : kareport::reportViews(*this)) {
         // The view must hold the report as it is now, and no editor is to be started for it.
         const bool externalEditor = externalEditor_;
         externalEditor_ = false;
@@ -232,7 +190,7 @@ void UReportDoc::SaveText()
         return;
     }
     QString edited;
-    for (UView *view : reportViews(*this)) {
+    for (UView *view : kareport::reportViews(*this)) {
         QBuffer bytes;
         bytes.open(QIODevice::WriteOnly);
         if (dynamic_cast<const kareport::ReportViewPort *>(view)->streamPlainText(bytes) && bytes.size() > 0) {
@@ -244,15 +202,17 @@ void UReportDoc::SaveText()
     if (text.isEmpty()) {
         return;
     }
-    UDocument *receiver = openDocument(textObject_);
-    if (receiver == nullptr) {
+    // The pointer may be stale.
+    const UApplication *application = UApplication::Get();
+    if (application == nullptr || !application->IsOpen(textObject_)) {
         return;
     }
+    auto *receiver = static_cast<UDocument *>(textObject_);
     const bool taken = receiver->OnTextReceived(textObjectId_, text);
     if (!IsReportAvailable(this)) {
         return; // the receiver has closed the report
     }
-    if (!taken || openDocument(textObject_) == nullptr) {
+    if (!taken || !application->IsOpen(textObject_)) {
         SetTextObject(nullptr, 0);
     }
 }

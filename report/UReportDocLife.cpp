@@ -1,7 +1,7 @@
 #include "UReportDoc.h"
 
 #include "CViewPane.h"
-#include "ReportViewPort.h"
+#include "ReportViews.h"
 #include "ReportWindow.h"
 #include "TemplateText.h"
 #include "UDocTemplate.h"
@@ -11,13 +11,10 @@
 
 #include <algorithm>
 
+using kareport::showsReport;
+
 namespace
 {
-
-bool showsReport(const UView *view)
-{
-    return dynamic_cast<const kareport::ReportViewPort *>(view) != nullptr;
-}
 
 /// Whether an open pane has the title, with the number that it has among several of one document or without.
 bool isTaken(const QString &title)

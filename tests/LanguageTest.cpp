@@ -3,6 +3,8 @@
 #include "Xlate.h"
 
 #include <QCoreApplication>
+#include <QFile>
+#include <QLibraryInfo>
 
 #include <gtest/gtest.h>
 
@@ -50,9 +52,8 @@ TEST_F(Languages, ANoteForTranslatorsIsNeverShown)
 TEST_F(Languages, QtsOwnTextsFollowWhereTheyAreInstalled)
 {
     const char *const cancel = "Cancel";
-    if (kareport::setLanguage(QStringLiteral("de")) != QStringLiteral("de") ||
-        QCoreApplication::translate("QPlatformTheme", cancel) == QString::fromUtf8(cancel))
-    {
+    ASSERT_EQ(kareport::setLanguage(QStringLiteral("de")), QStringLiteral("de"));
+    if (!QFile::exists(QLibraryInfo::path(QLibraryInfo::TranslationsPath) + QStringLiteral("/qtbase_de.qm"))) {
         GTEST_SKIP() << "Qt's translations are not installed";
     }
     EXPECT_EQ(QCoreApplication::translate("QPlatformTheme", cancel), QStringLiteral("Abbrechen"));

@@ -254,6 +254,21 @@
         <translation>Kopf- und Fußzeilen werden nicht angezeigt: %1.</translation>
     </message>
     <message>
+        <location filename="../report/ReportSaveName.cpp"/>
+        <source>RTF Files (*.rtf)|*.rtf|Report Files (*.rep)|*.rep|PDF (*.pdf)|*.pdf|</source>
+        <translation>RTF-Dateien (*.rtf)|*.rtf|Berichtsdateien (*.rep)|*.rep|PDF (*.pdf)|*.pdf|</translation>
+    </message>
+    <message>
+        <location filename="../report/ReportSaveName.cpp"/>
+        <source>Report Files (*.rep)|*.rep|RTF Files (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|</source>
+        <translation>Berichtsdateien (*.rep)|*.rep|RTF-Dateien (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|</translation>
+    </message>
+    <message>
+        <location filename="../report/ReportSaveName.cpp"/>
+        <source>"%1" could not be saved. Choose another folder, or make room on the disk.</source>
+        <translation>„%1“ konnte nicht gespeichert werden. Einen anderen Ordner wählen oder Platz auf dem Datenträger schaffen.</translation>
+    </message>
+    <message>
         <location filename="../report/UReportDoc.cpp"/>
         <source>Station</source>
         <translation>Station</translation>
@@ -263,21 +278,6 @@
         <source>   Page:</source>
         <comment>Report Header</comment>
         <translation>   Seite:</translation>
-    </message>
-    <message>
-        <location filename="../report/UReportDocFile.cpp"/>
-        <source>RTF Files (*.rtf)|*.rtf|Report Files (*.rep)|*.rep|PDF (*.pdf)|*.pdf|</source>
-        <translation>RTF-Dateien (*.rtf)|*.rtf|Berichtsdateien (*.rep)|*.rep|PDF (*.pdf)|*.pdf|</translation>
-    </message>
-    <message>
-        <location filename="../report/UReportDocFile.cpp"/>
-        <source>Report Files (*.rep)|*.rep|RTF Files (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|</source>
-        <translation>Berichtsdateien (*.rep)|*.rep|RTF-Dateien (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|</translation>
-    </message>
-    <message>
-        <location filename="../report/UReportDocFile.cpp"/>
-        <source>"%1" could not be saved. Choose another folder, or make room on the disk.</source>
-        <translation>„%1“ konnte nicht gespeichert werden. Einen anderen Ordner wählen oder Platz auf dem Datenträger schaffen.</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>

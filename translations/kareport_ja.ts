@@ -254,6 +254,21 @@
         <translation>ヘッダーとフッターは表示されません: %1 個。</translation>
     </message>
     <message>
+        <location filename="../report/ReportSaveName.cpp"/>
+        <source>RTF Files (*.rtf)|*.rtf|Report Files (*.rep)|*.rep|PDF (*.pdf)|*.pdf|</source>
+        <translation>RTF ファイル (*.rtf)|*.rtf|帳票ファイル (*.rep)|*.rep|PDF (*.pdf)|*.pdf|</translation>
+    </message>
+    <message>
+        <location filename="../report/ReportSaveName.cpp"/>
+        <source>Report Files (*.rep)|*.rep|RTF Files (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|</source>
+        <translation>帳票ファイル (*.rep)|*.rep|RTF ファイル (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|</translation>
+    </message>
+    <message>
+        <location filename="../report/ReportSaveName.cpp"/>
+        <source>"%1" could not be saved. Choose another folder, or make room on the disk.</source>
+        <translation>「%1」を保存できませんでした。別のフォルダーを選ぶか、ディスクの空き容量を増やしてください。</translation>
+    </message>
+    <message>
         <location filename="../report/UReportDoc.cpp"/>
         <source>Station</source>
         <translation>測点No.</translation>
@@ -263,21 +278,6 @@
         <source>   Page:</source>
         <comment>Report Header</comment>
         <translation>   頁:</translation>
-    </message>
-    <message>
-        <location filename="../report/UReportDocFile.cpp"/>
-        <source>RTF Files (*.rtf)|*.rtf|Report Files (*.rep)|*.rep|PDF (*.pdf)|*.pdf|</source>
-        <translation>RTF ファイル (*.rtf)|*.rtf|帳票ファイル (*.rep)|*.rep|PDF (*.pdf)|*.pdf|</translation>
-    </message>
-    <message>
-        <location filename="../report/UReportDocFile.cpp"/>
-        <source>Report Files (*.rep)|*.rep|RTF Files (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|</source>
-        <translation>帳票ファイル (*.rep)|*.rep|RTF ファイル (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|</translation>
-    </message>
-    <message>
-        <location filename="../report/UReportDocFile.cpp"/>
-        <source>"%1" could not be saved. Choose another folder, or make room on the disk.</source>
-        <translation>「%1」を保存できませんでした。別のフォルダーを選ぶか、ディスクの空き容量を増やしてください。</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>

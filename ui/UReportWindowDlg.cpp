@@ -18,8 +18,6 @@
 namespace
 {
 
-/// The longest name of a face.
-constexpr qsizetype longestFaceName = 31;
 /// The font of a window that is not linked to a report yet.
 const QString reportFace = QStringLiteral("Lucida Console");
 constexpr unsigned reportPoints = 8;
@@ -164,9 +162,8 @@ void UReportWindowDlg::SetReportDoc(UReportDoc *report)
     report_ = report;
     if (body_) {
         report = GetReportDoc();
-        body_->list().setFont(
-            report != nullptr ? kareport::reportFont(report->GetFontName().left(longestFaceName), report->GetFontSize())
-                              : kareport::reportFont(reportFace, reportPoints));
+        body_->list().setFont(report != nullptr ? kareport::reportFont(*report)
+                                                : kareport::reportFont(reportFace, reportPoints));
         updateCommands();
     }
 }

@@ -2,10 +2,8 @@
 
 #include "AppMessageBox.h"
 #include "CViewPane.h"
-#include "Folders.h"
 #include "ReportEntry.h"
-#include "SaveDialog.h"
-#include "StandardText.h"
+#include "ReportSaveName.h"
 #include "UDocTemplate.h"
 #include "UReportDoc.h"
 #include "UReportView.h"
@@ -15,8 +13,6 @@
 
 namespace
 {
-
-const QString lastFolderEntry = QStringLiteral("LastOpenDirectoryReport");
 
 UReportView *firstReportView(const UReportDoc &report)
 {
@@ -68,27 +64,17 @@ void UReportWindowDlg::OnSave()
     if (report == nullptr) {
         return;
     }
-    kareport::SaveRequest request;
-    request.defaultExtension = QStringLiteral("rep");
-    request.initialFolder = GetInitialOpenDir(lastFolderEntry);
-    request.filter = Xlate("Report Files (*.rep)|*.rep|RTF Files (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|") +
-                     kareport::standardText(kareport::allFilesTitle) + QStringLiteral("|*.*||");
-    request.flags = kareport::SaveRequest::overwritePrompt | kareport::SaveRequest::hideReadOnly |
-                    kareport::SaveRequest::pathMustExist;
-    const auto path = kareport::askSaveName(request);
+    const auto path = kareport::askReportName(false);
     if (!path) {
         return;
     }
-    SetLastOpenDir(*path, lastFolderEntry);
     // The report may have been closed while the dialog was open, or by what its views do when it is saved.
     if (!UReportDoc::IsReportAvailable(report)) {
         return;
     }
     const bool isSaved = report->OnSaveDocument(*path);
     if (!isSaved) {
-        kareport::showMessage(
-            {Xlate("\"%1\" could not be saved. Choose another folder, or make room on the disk.").arg(*path), QString(),
-             MessageButtons::Ok, kareport::MessageIcon::None});
+        kareport::sayNotSaved(*path);
     } else if (UReportDoc::IsReportAvailable(report)) {
         report->SetModifiedFlag(false);
     }

@@ -18,14 +18,6 @@ using kareport::ReportChange;
 using kareport::ReportEdit;
 using kareport::ReportViewWidget;
 
-namespace
-{
-
-/// The longest name of a face.
-constexpr qsizetype longestFaceName = 31;
-
-} // namespace
-
 UReportView::UReportView()
 {
     auto *widget = new ReportViewWidget;
@@ -78,7 +70,7 @@ int UReportView::OnCreate()
     if (!widget_ || report == nullptr) {
         return -1;
     }
-    edit_->setReportFont(kareport::reportFont(report->GetFontName().left(longestFaceName), report->GetFontSize()));
+    edit_->setReportFont(kareport::reportFont(*report));
     return 0;
 }
 

@@ -5,6 +5,7 @@
 #include "JobLauncher.h"
 #include "PreferencesDialog.h"
 #include "ReportEntry.h"
+#include "ReportSaveName.h"
 #include "SavedReports.h"
 #include "TemplateDialog.h"
 #include "UApplication.h"
@@ -27,21 +28,14 @@
 namespace
 {
 
-const QString lastFolderEntry = QStringLiteral("LastOpenDirectoryReport");
-
 std::vector<UDocument *> openDocuments()
 {
-    std::vector<UDocument *> documents;
-    for (const auto &docTemplate : UApplication::Get()->GetDocTemplates()) {
-        documents.insert(documents.end(), docTemplate->GetDocuments().begin(), docTemplate->GetDocuments().end());
-    }
-    return documents;
+    return UApplication::Get()->GetDocuments();
 }
 
 bool isOpen(const UDocument *document)
 {
-    const auto documents = openDocuments();
-    return std::find(documents.begin(), documents.end(), document) != documents.end();
+    return UApplication::Get()->IsOpen(document);
 }
 
 /// The open document of a file; null when there is none.
@@ -87,7 +81,7 @@ DeskFrame::DeskFrame() : files_([this](const QString &path) { fileChanged(path);
     statusBar()->showMessage(Xlate("Open a job or a saved report, or drop it here."));
     askFile = [this]() -> std::optional<QString> {
         const QString path =
-            QFileDialog::getOpenFileName(this, Xlate("Open"), GetInitialOpenDir(lastFolderEntry),
+            QFileDialog::getOpenFileName(this, Xlate("Open"), GetInitialOpenDir(kareport::lastReportFolder),
                                          Xlate("Reports, jobs and templates (*.rep *.rtf *.json *.xml)") +
                                              QStringLiteral(";;") + Xlate("All files (*)"));
         return path.isEmpty() ? std::nullopt : std::optional(path);
@@ -155,7 +149,7 @@ void DeskFrame::activateSomeView()
         }
     }
     if (GetActiveView() == nullptr && last != nullptr) {
-        activate(last->GetDocument());
+        UApplication::Get()->SetCurrentReport(last->GetDocument());
         SetActiveViewForFrameAndPane(last);
     }
 }
@@ -163,7 +157,7 @@ void DeskFrame::activateSomeView()
 void DeskFrame::open()
 {
     if (const auto path = askFile()) {
-        SetLastOpenDir(*path, lastFolderEntry);
+        SetLastOpenDir(*path, kareport::lastReportFolder);
         OpenFile(*path);
     }
 }
@@ -186,7 +180,7 @@ void DeskFrame::askPreferences()
 bool DeskFrame::finishOpening(UDocument *report, const QString &error)
 {
     if (!error.isEmpty()) {
-        kareport::showMessage({error, QString(), MessageButtons::Ok, kareport::MessageIcon::None});
+        AppMessageBox(error);
     }
     if (report != nullptr) {
         activate(report);
@@ -303,11 +297,8 @@ void DeskFrame::fileChanged(const QString &path)
                 : Xlate("\"%1\" was changed by another program. Load it again?");
         const MessageAnswer answer = kareport::showMessage(
             {question.arg(path), QString(), MessageButtons::YesNo, kareport::MessageIcon::Question});
-        if (answer == MessageAnswer::Yes && isOpen(document)) {
-            if (!kareport::reloadSavedReport(*document)) {
-                kareport::showMessage({Xlate("\"%1\" could not be opened.").arg(path), QString(), MessageButtons::Ok,
-                                       kareport::MessageIcon::None});
-            }
+        if (answer == MessageAnswer::Yes && isOpen(document) && !kareport::reloadSavedReport(*document)) {
+            AppMessageBox(Xlate("\"%1\" could not be opened.").arg(path));
         }
         return;
     }
@@ -334,9 +325,7 @@ void DeskFrame::closeEvent(QCloseEvent *event)
         }
     }
     saveLayout();
-    for (const auto &docTemplate : UApplication::Get()->GetDocTemplates()) {
-        docTemplate->CloseAllDocuments();
-    }
+    UApplication::Get()->CloseAllDocuments();
     event->accept();
 }
 

@@ -26,8 +26,7 @@ void showInstead(UReportDoc *report, const QString &program)
         report->SetModifiedFlag(true); // it is saved nowhere but in a temporary file
         report->UpdateAllViews(nullptr, 0, nullptr);
     }
-    showMessage({Xlate("\"%1\" could not be started. Choose another program under Preferences.").arg(program),
-                 QString(), MessageButtons::Ok, MessageIcon::None});
+    AppMessageBox(Xlate("\"%1\" could not be started. Choose another program under Preferences.").arg(program));
 }
 
 } // namespace

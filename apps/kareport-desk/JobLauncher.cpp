@@ -5,6 +5,7 @@
 #include "Interrupt.h"
 #include "JobReader.h"
 #include "JobRunner.h"
+#include "Preferences.h"
 #include "Progress.h"
 #include "ReportWindow.h"
 #include "ReportWindowEntry.h"
@@ -76,20 +77,21 @@ void closeReport(UReportDoc *report)
     }
 }
 
-CViewPane *paneOf(const UReportDoc &report)
+void setWindowCaption(const UReportDoc &report, const QString &caption)
 {
-    return report.GetReportWindow() != nullptr ? report.GetReportWindow()->GetOwningPane() : nullptr;
+    CViewPane *pane = report.GetReportWindow() != nullptr ? report.GetReportWindow()->GetOwningPane() : nullptr;
+    if (pane != nullptr) {
+        pane->SetWindowTextW(caption);
+    }
 }
 
 /// A report that is shown in a report window while it is written.
 UReportDoc *makeShown(bool header, const QString &caption)
 {
     // The job gives the title; a title that is given twice would be numbered.
-    UReportDoc *report = CreateReportWindow(QString(), header, loadPreferences().usesEditor);
+    UReportDoc *report = CreateReportWindow(QString(), header, GetUsePreferredReportEditorFlag() != 0);
     if (report != nullptr) {
-        if (CViewPane *pane = paneOf(*report)) {
-            pane->SetWindowTextW(caption);
-        }
+        setWindowCaption(*report, caption);
     }
     return report;
 }
@@ -130,9 +132,7 @@ UReportDoc *runJob(Expected<JsonSource> read, QWidget *parent, QString &error)
         return nullptr;
     }
     if (report != nullptr) {
-        if (CViewPane *pane = paneOf(*report)) {
-            pane->SetWindowTextW(report->GetTitle());
-        }
+        setWindowCaption(*report, report->GetTitle());
         report->SetReportWindowActive();
     }
     return report;

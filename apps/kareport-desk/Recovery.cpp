@@ -170,18 +170,17 @@ QString Recovery::textFileOf(const UReportDoc &report)
     return written.file;
 }
 
+void Recovery::forget(const UReportDoc *report)
+{
+    gone_.append(written_.take(report).file);
+}
+
 bool Recovery::keep()
 {
     if (folder_.isEmpty()) {
         return false;
     }
     isComplete_ = true;
-    for (const UReportDoc *report : closed_) {
-        if (const QString file = written_.take(report).file; !file.isEmpty()) {
-            gone_.append(file);
-        }
-    }
-    closed_.clear();
     QJsonArray list;
     QHash<const UReportDoc *, Written> kept;
     for (const UDocument *document : GetReportTemplate()->GetDocuments()) {
@@ -210,6 +209,7 @@ bool Recovery::keep()
             gone_.append(written->file);
         }
     }
+    gone_.removeAll(QString()); // of reports whose text was never written
     for (const QString &file : std::exchange(gone_, {})) {
         QFile::remove(QDir(folder_).filePath(file));
     }

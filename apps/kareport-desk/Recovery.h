@@ -2,7 +2,6 @@
 
 #include <QHash>
 #include <QLockFile>
-#include <QSet>
 #include <QString>
 
 #include <memory>
@@ -48,7 +47,7 @@ public:
     /// written by a job not yet. @return whether all of it is on the disk
     bool keep();
     /// A report has been closed: what comes in its place in memory is another one.
-    void forget(const UReportDoc *report) { closed_.insert(report); }
+    void forget(const UReportDoc *report);
 
 private:
     struct Written
@@ -64,9 +63,8 @@ private:
     std::unique_ptr<QLockFile> lock_;
     std::vector<std::pair<QString, std::unique_ptr<QLockFile>>> left_; ///< folders of crashed programs
     QHash<const UReportDoc *, Written> written_;
-    QSet<const UReportDoc *> closed_; ///< since `keep` was called last
-    QStringList gone_;                ///< texts that are no longer needed
-    QByteArray list_;                 ///< as it was written last
+    QStringList gone_; ///< texts that are no longer needed
+    QByteArray list_;  ///< as it was written last
     int lastNumber_ = 0;
     bool isComplete_ = true; ///< whether the last `keep` could write all texts
 };

@@ -1,5 +1,7 @@
 #include "Language.h"
 
+#include "TranslatorNote.h"
+
 #include <QCoreApplication>
 #include <QDir>
 #include <QLibraryInfo>
@@ -58,17 +60,13 @@ QStringList translatedLanguages()
 
 QStringList inAllLanguages(const char *text)
 {
-    const QByteArray whole(text);
-    const qsizetype mark = whole.indexOf("@@");
-    const QByteArray shown = mark < 0 ? whole : whole.first(mark);
-    const QByteArray note = mark < 0 ? QByteArray() : whole.sliced(mark + 2);
-    QStringList texts(QString::fromUtf8(shown));
+    const NotedText noted(text);
+    QStringList texts(QString::fromUtf8(noted.text));
     for (const QString &language : translatedLanguages()) {
         QTranslator translator;
-        const QString translated =
-            translator.load(QStringLiteral("kareport_") + language, folder)
-                ? translator.translate("KaReport", shown.constData(), mark < 0 ? nullptr : note.constData())
-                : QString();
+        const QString translated = translator.load(QStringLiteral("kareport_") + language, folder)
+                                       ? translator.translate("KaReport", noted.text.constData(), noted.noteOrNull())
+                                       : QString();
         if (!translated.isEmpty()) {
             texts.append(translated);
         }

@@ -1,16 +1,11 @@
 #include "Xlate.h"
 
-#include <QByteArrayView>
+#include "TranslatorNote.h"
+
 #include <QCoreApplication>
 
 QString Xlate(const char *text)
 {
-    const QByteArrayView whole(text);
-    const qsizetype mark = whole.indexOf("@@");
-    if (mark < 0) {
-        return QCoreApplication::translate("KaReport", text);
-    }
-    const QByteArray shown = whole.first(mark).toByteArray();
-    const QByteArray note = whole.sliced(mark + 2).toByteArray();
-    return QCoreApplication::translate("KaReport", shown.constData(), note.constData());
+    const kareport::NotedText noted(text);
+    return QCoreApplication::translate("KaReport", noted.text.constData(), noted.noteOrNull());
 }

@@ -1,5 +1,7 @@
 #include "UApplication.h"
 
+#include <algorithm>
+
 namespace
 {
 
@@ -21,9 +23,7 @@ UApplication::UApplication()
 UApplication::~UApplication()
 {
     // Documents that close may still ask for the application and its templates.
-    for (const auto &docTemplate : templates_) {
-        docTemplate->CloseAllDocuments();
-    }
+    CloseAllDocuments();
     templates_.clear();
     currentApplication() = nullptr;
 }
@@ -36,6 +36,29 @@ UApplication *UApplication::Get()
 UDocTemplate *UApplication::AddDocTemplate(std::unique_ptr<UDocTemplate> docTemplate)
 {
     return templates_.emplace_back(std::move(docTemplate)).get();
+}
+
+std::vector<UDocument *> UApplication::GetDocuments() const
+{
+    std::vector<UDocument *> documents;
+    for (const auto &docTemplate : templates_) {
+        documents.insert(documents.end(), docTemplate->GetDocuments().begin(), docTemplate->GetDocuments().end());
+    }
+    return documents;
+}
+
+bool UApplication::IsOpen(const void *document) const
+{
+    const std::vector<UDocument *> documents = GetDocuments();
+    return std::any_of(documents.begin(), documents.end(),
+                       [document](const UDocument *open) { return open == document; });
+}
+
+void UApplication::CloseAllDocuments()
+{
+    for (const auto &docTemplate : templates_) {
+        docTemplate->CloseAllDocuments();
+    }
 }
 
 void UApplication::AddToRecentFileList(const QString &path)

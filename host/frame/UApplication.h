@@ -26,6 +26,13 @@ public:
     /// In the order in which they were added.
     const std::vector<std::unique_ptr<UDocTemplate>> &GetDocTemplates() const { return templates_; }
 
+    /// The documents of all templates, those of a template together, in the order in which they were made.
+    std::vector<UDocument *> GetDocuments() const;
+    /// Whether a pointer is an open document; it may be stale.
+    bool IsOpen(const void *document) const;
+    /// Closes the documents of all templates and their panes without asking.
+    void CloseAllDocuments();
+
     /// Puts a file to the front of the list of files last used.
     virtual void AddToRecentFileList(const QString &path);
     const QStringList &GetRecentFileList() const { return recentFiles_; }

@@ -1,0 +1,33 @@
+#include "ReportSaveName.h"
+
+#include "AppMessageBox.h"
+#include "Folders.h"
+#include "SaveDialog.h"
+#include "StandardText.h"
+#include "Xlate.h"
+
+namespace kareport
+{
+
+std::optional<QString> askReportName(bool richTextFirst)
+{
+    SaveRequest request;
+    request.defaultExtension = QStringLiteral("rep");
+    request.initialFolder = GetInitialOpenDir(lastReportFolder);
+    request.flags = SaveRequest::hideReadOnly | SaveRequest::overwritePrompt | SaveRequest::pathMustExist;
+    request.filter = (richTextFirst ? Xlate("RTF Files (*.rtf)|*.rtf|Report Files (*.rep)|*.rep|PDF (*.pdf)|*.pdf|")
+                                    : Xlate("Report Files (*.rep)|*.rep|RTF Files (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|")) +
+                     standardText(allFilesTitle) + QStringLiteral("|*.*||");
+    const auto chosen = askSaveName(request);
+    if (chosen) {
+        SetLastOpenDir(*chosen, lastReportFolder);
+    }
+    return chosen;
+}
+
+void sayNotSaved(const QString &path)
+{
+    AppMessageBox(Xlate("\"%1\" could not be saved. Choose another folder, or make room on the disk.").arg(path));
+}
+
+} // namespace kareport

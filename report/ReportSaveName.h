@@ -1,0 +1,22 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QString>
+
+#include <optional>
+
+namespace kareport
+{
+
+/// The profile entry of the folder that a report was opened from or saved in last.
+inline const QString lastReportFolder = QStringLiteral("LastOpenDirectoryReport");
+
+/// Asks for the name of a file to save a report in, beginning with the folder used last, and keeps its folder.
+/// @param richTextFirst  offers rich text before report text
+/// @return nothing when the user has cancelled
+KAREPORT_EXPORT std::optional<QString> askReportName(bool richTextFirst);
+/// Says that a report could not be saved, and what to do.
+KAREPORT_EXPORT void sayNotSaved(const QString &path);
+
+} // namespace kareport
