@@ -109,7 +109,6 @@ TEST(CommandLine, AWrongCommandLineIsStatus1)
         {"", "no command"},
         {"print job.json", "no such command"},
         {"render", "nothing to render"},
-        {"render job.json other.json", "two jobs"},
         {"render job.json --colour", "no such option"},
         {"render job.json -o", "no file name"},
         {"render job.json --as doc", "no such kind"},
@@ -153,8 +152,8 @@ TEST(CommandLine, HelpAndVersionGoToStandardOutput)
     const Row rows[] = {
         {"--help", {"render", "templates", "check", "Exit status"}},
         {"render --help",
-         {"--output", "--as", "--set", "--template", "--name", "--table", "--block", "--data", "--progress",
-          "--quiet"}},
+         {"--output", "--as", "--set", "--template", "--name", "--table", "--block", "--data", "--progress", "--quiet",
+          "--jobs", "--slice", "--update"}},
         {"templates --help", {"--name", "--json"}},
         {"check --help", {"FILE"}},
     };

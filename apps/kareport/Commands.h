@@ -23,8 +23,11 @@ enum ExitStatus
 /// `kareport render`
 struct RenderCommand
 {
-    QString job;             ///< empty for the short form
-    TemplateJob templateJob; ///< the short form
+    QStringList jobs;          ///< job files
+    QString jobList;           ///< a file that names job files; "-" for standard input, empty for none
+    QString slice;             ///< "3/8" for the third of eight parts of all these jobs; empty for all of them
+    bool onlyOutdated = false; ///< leave jobs out whose outputs are up to date
+    TemplateJob templateJob;   ///< the short form: no job file
     QStringList outputs;
     QString as;
     QStringList sets;
@@ -35,6 +38,14 @@ struct RenderCommand
     std::optional<QString> usageError() const;
     /// `argc` and `argv` are the program's own, for Qt.
     ExitStatus run(int &argc, char **argv) const;
+
+    /// Whether it is for any number of jobs.
+    bool isBatch() const;
+
+private:
+    bool isShort() const;
+    std::optional<QString> wrongSource() const;
+    std::optional<QString> wrongOutputs() const;
 };
 
 /// `kareport convert`

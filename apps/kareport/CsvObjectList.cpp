@@ -141,7 +141,7 @@ bool CsvObjectList::readRow(RowBatch &batch)
         batch.error = reader_.error();
         return false;
     }
-    batch.error = storeCells(batch.objects[batch.count], nullptr);
+    batch.error = storeCells(batch.next(), nullptr);
     batch.count += batch.error ? 0U : 1U;
     return !batch.error;
 }

@@ -10,6 +10,8 @@ namespace
 
 /// What is read into memory from a pipe or a device, which may never end.
 constexpr qint64 largestUnmapped = qint64(1) << 30;
+/// A smaller file is read: mapping it, and above all taking the mapping back on every processor, takes longer.
+constexpr qint64 smallestMapped = qint64(1) << 20;
 
 } // namespace
 
@@ -22,11 +24,11 @@ Expected<std::shared_ptr<const FileBytes>> FileBytes::open(const QString &path)
         return InputError{path, std::nullopt, bytes->file_.errorString()};
     }
     const qint64 size = bytes->file_.size();
-    if (const uchar *mapped = size > 0 ? bytes->file_.map(0, size) : nullptr) {
+    if (const uchar *mapped = size >= smallestMapped ? bytes->file_.map(0, size) : nullptr) {
         bytes->view_ = {reinterpret_cast<const char *>(mapped), static_cast<std::size_t>(size)};
         return std::shared_ptr<const FileBytes>(std::move(bytes));
     }
-    bytes->content_ = bytes->file_.read(largestUnmapped + 1);
+    bytes->content_ = bytes->file_.read(size > 0 ? size : largestUnmapped + 1);
     if (bytes->content_.size() > largestUnmapped) {
         return InputError{path, TextPlace(),
                           Xlate("more than %1 MB come out of what is no file").arg(largestUnmapped >> 20)};

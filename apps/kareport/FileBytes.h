@@ -12,7 +12,7 @@
 namespace kareport
 {
 
-/// The bytes of a file, mapped where the system can, so that a large file is never in memory as a whole.
+/// The bytes of a file. A large one is mapped where the system can, so that it is never in memory as a whole.
 class FileBytes
 {
 public:
@@ -24,7 +24,7 @@ public:
 private:
     QString path_;
     QFile file_;
-    QByteArray content_; ///< of a file that cannot be mapped
+    QByteArray content_; ///< of a file that is not mapped
     std::string_view view_;
 };
 

@@ -9,7 +9,6 @@
 #include "TemplateSource.h"
 #include "Xlate.h"
 
-#include <QDir>
 #include <QFileInfo>
 
 #include <algorithm>
@@ -263,26 +262,26 @@ std::optional<InputError> JobRunner::loadTemplate()
     if (!job_.reportTemplate) {
         return std::nullopt;
     }
-    // The job's own file wins over an installed one of the same name.
-    const QString own = QDir(job_.folder).filePath(job_.reportTemplate->file);
-    const QString installed = QDir(GetLibraryDir(false)).filePath(job_.reportTemplate->file);
-    const QString path = QFileInfo::exists(own) || !QFileInfo::exists(installed) ? own : installed;
+    const QString path = templatePath(job_);
     const QFileInfo info(path);
     if (!info.isFile()) {
         JsonNode(source_)["template"]["file"].fail(Xlate("there is no template file \"%1\"").arg(path));
         return source_.error();
     }
-    const auto file = readTemplateSource(path);
-    if (const InputError *error = errorOf(file)) {
-        return *error;
+    if (auto wrong = wrongTemplateSource(path)) {
+        return wrong;
     }
     setLibraryDir(info.absolutePath());
     setStartPathName(info.absolutePath());
     const bool loaded = report_->LoadTemplateXml(info.fileName(), job_.reportTemplate->name, QString(), QString());
     setLibraryDir(QString());
     setStartPathName(job_.folder);
-    return loaded ? std::nullopt
-                  : std::optional(whyNotLoaded(path, std::get<TemplateFile>(file), job_.reportTemplate->name));
+    if (loaded) {
+        return std::nullopt;
+    }
+    const auto file = readTemplateSource(path);
+    const InputError *error = errorOf(file);
+    return error != nullptr ? *error : whyNotLoaded(path, std::get<TemplateFile>(file), job_.reportTemplate->name);
 }
 
 void JobRunner::applyOptions()

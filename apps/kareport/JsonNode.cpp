@@ -82,8 +82,10 @@ Expected<JsonSource> JsonSource::read(const QString &path)
     if (!file.open(QIODevice::ReadOnly)) {
         return InputError{path, std::nullopt, Xlate("the file cannot be read: %1").arg(file.errorString())};
     }
-    const QByteArray bytes = file.read(largestJob + 1);
-    if (bytes.size() > largestJob) {
+    // A pipe has no size, and may never end.
+    const qint64 size = file.size();
+    const QByteArray bytes = size > largestJob ? QByteArray() : file.read(size > 0 ? size : largestJob + 1);
+    if (std::max<qint64>(size, bytes.size()) > largestJob) {
         return InputError{path, TextPlace(),
                           Xlate("the file is larger than %1 MB: a job was expected").arg(largestJob >> 20)};
     }

@@ -15,7 +15,7 @@ void Progress::begin(const QString &what, std::size_t total)
 {
     what_ = what;
     total_ = total;
-    if (shown_) {
+    if (shown_ && (prefix_.isEmpty() || !sinceShown_.isValid() || sinceShown_.elapsed() >= millisecondsBetween)) {
         sinceShown_.start();
         show(0);
     }
@@ -37,7 +37,7 @@ void Progress::advance(std::size_t done, std::size_t total)
 
 void Progress::show(std::size_t done)
 {
-    QString line = what_;
+    QString line = prefix_ + what_;
     if (total_ > 0) {
         line += QStringLiteral(" %1 %").arg(std::min(done, total_) * 100 / total_);
     }

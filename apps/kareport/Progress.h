@@ -17,6 +17,9 @@ public:
     Progress(const Progress &) = delete;
     Progress &operator=(const Progress &) = delete;
 
+    /// What stands before all that is shown, for work that is one of many. Many short works do not flicker then: what each
+    /// begins with is shown a few times a second as well.
+    void setPrefix(const QString &prefix) { prefix_ = prefix; }
     /// Begins a piece of work. @param total  what `advance` counts to; 0 when that is not known
     void begin(const QString &what, std::size_t total);
     /// Shows how much is done, a few times a second at most.
@@ -33,6 +36,7 @@ protected:
 
 private:
     bool shown_;
+    QString prefix_;
     QString what_;
     std::size_t total_ = 0;
     QElapsedTimer sinceShown_;

@@ -1,34 +1,64 @@
 #include "Commands.h"
 
 #include "CommandSetup.h"
-#include "Interrupt.h"
-#include "JobReader.h"
-#include "JobRunner.h"
-#include "OutputsWriter.h"
+#include "JobList.h"
+#include "RenderBatch.h"
+#include "RenderJob.h"
+#include "UpToDate.h"
 #include "Xlate.h"
 
 namespace kareport
 {
 
-std::optional<QString> RenderCommand::usageError() const
+bool RenderCommand::isShort() const
 {
     const auto &[templateFile, templateName, table, block, data] = templateJob;
-    const bool isShort =
-        !templateFile.isEmpty() || !templateName.isEmpty() || !table.isEmpty() || !block.isEmpty() || !data.isEmpty();
-    if (job.isEmpty() != isShort) {
-        return Xlate("either a job file or --template, --name, --table or --block, and --data were expected");
+    return !templateFile.isEmpty() || !templateName.isEmpty() || !table.isEmpty() || !block.isEmpty() ||
+           !data.isEmpty();
+}
+
+bool RenderCommand::isBatch() const
+{
+    return jobs.size() > 1 || !jobList.isEmpty() || !slice.isEmpty();
+}
+
+std::optional<QString> RenderCommand::usageError() const
+{
+    auto wrong = wrongSource();
+    wrong = wrong ? wrong : wrongKindName(as);
+    return wrong ? wrong : wrongOutputs();
+}
+
+std::optional<QString> RenderCommand::wrongSource() const
+{
+    const auto &[templateFile, templateName, table, block, data] = templateJob;
+    if ((jobs.isEmpty() && jobList.isEmpty()) != isShort()) {
+        return Xlate("either job files or --template, --name, --table or --block, and --data were expected");
     }
-    if (isShort &&
+    if (isShort() &&
         (templateFile.isEmpty() || templateName.isEmpty() || data.isEmpty() || table.isEmpty() == block.isEmpty()))
     {
         return Xlate("--template, --name, --data and one of --table and --block were expected");
     }
-    if (const auto wrong = wrongKindName(as)) {
-        return wrong;
+    if (isShort() && !slice.isEmpty()) {
+        return Xlate("--slice takes a part of several job files: these were expected");
     }
+    if (!slice.isEmpty() && !JobSlice::fromText(slice)) {
+        return Xlate("--slice \"%1\": a number, a slash and the count of slices were expected, as in 3/8").arg(slice);
+    }
+    return std::nullopt;
+}
+
+std::optional<QString> RenderCommand::wrongOutputs() const
+{
     for (const QString &file : outputs) {
         if (const auto wrong = wrongOutput(file, as)) {
             return wrong;
+        }
+        if (isBatch() && file != u"-" && !file.contains(QStringLiteral("{}"))) {
+            return Xlate("-o \"%1\" is one file for several jobs: a name with {} was expected, which stands for the "
+                         "name of the job file")
+                .arg(file);
         }
     }
     return std::nullopt;
@@ -36,45 +66,33 @@ std::optional<QString> RenderCommand::usageError() const
 
 ExitStatus RenderCommand::run(int &argc, char **argv) const
 {
-    auto read =
-        job.isEmpty() ? Expected<JsonSource>(JsonSource::fromObject(templateJob.toJson())) : JsonSource::read(job);
-    if (const InputError *error = errorOf(read)) {
-        printError(error->message());
-        return exitInput;
-    }
-    auto &source = std::get<JsonSource>(read);
-    if (const auto wrong = applySets(source, sets)) {
-        return usageExit(*wrong);
-    }
-    const auto kindOtherwise = outputKindFromName(as);
-    Job readyJob = readJob(source, kindOtherwise);
-    if (source.error()) {
-        printError(source.error()->message());
-        return exitInput;
-    }
-    if (!outputs.isEmpty()) {
-        readyJob.outputs.clear();
-        for (const QString &file : outputs) {
-            readyJob.outputs.push_back({file, *outputKindOf(file, kindOtherwise)});
+    if (isBatch()) {
+        QStringList all = jobs;
+        if (!jobList.isEmpty()) {
+            const auto listed = readJobList(jobList);
+            if (const InputError *error = errorOf(listed)) {
+                printError(error->message());
+                return exitInput;
+            }
+            all += std::get<QStringList>(listed);
         }
-    } else if (readyJob.outputs.empty()) {
-        readyJob.outputs.push_back({QStringLiteral("-"), *outputKindOf(QStringLiteral("-"), kindOtherwise)});
+        const auto application = startQt(argc, argv, true);
+        return RenderBatch(*this).run(slice.isEmpty() ? all : JobSlice::fromText(slice)->of(all));
     }
-
-    const auto application = startQt(argc, argv, JobRunner::needsFonts(readyJob) || needsFonts(readyJob.outputs));
+    RenderJob job(*this, isShort() ? Expected<JsonSource>(JsonSource::fromObject(templateJob.toJson()))
+                                   : JsonSource::read(jobs.first()));
+    if (job.status() != exitDone) {
+        return job.status();
+    }
+    if (onlyOutdated && isUpToDate(job.job(), isShort() ? QString() : jobs.first())) {
+        if (!quiet) {
+            printError(Xlate("kareport: all is up to date; nothing was written"));
+        }
+        return exitDone;
+    }
+    const auto application = startQt(argc, argv, job.needsFonts());
     Progress bar(progress);
-    JobRunner runner(readyJob, source, bar);
-    const auto error = runner.run();
-    bar.finish();
-    if (isInterrupted()) {
-        printError(Xlate("kareport: stopped; nothing was written"));
-        return exitInterrupted;
-    }
-    if (error) {
-        printError(error->message());
-        return exitInput;
-    }
-    return writeOutputs(runner.report(), readyJob.outputs, bar, quiet);
+    return job.run(bar);
 }
 
 } // namespace kareport

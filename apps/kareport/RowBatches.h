@@ -20,20 +20,30 @@ struct RowBatch
     static constexpr std::size_t most = 512;
     static constexpr std::size_t mostBytes = std::size_t(1) << 20; ///< of the file, and one row more
 
-    std::vector<UDataObject> objects = std::vector<UDataObject>(most);
-    std::size_t count = 0;           ///< objects in use
-    bool isLast = false;             ///< no row follows, or none that can be read
-    std::optional<InputError> error; ///< what is wrong with the row behind the last
-    std::size_t position = 0;        ///< where reading has come to in the file
+    std::vector<UDataObject> objects; ///< as many as were ever in use
+    std::size_t count = 0;            ///< objects in use
+    bool isLast = false;              ///< no row follows, or none that can be read
+    std::optional<InputError> error;  ///< what is wrong with the row behind the last
+    std::size_t position = 0;         ///< where reading has come to in the file
+
+    /// The object behind those in use.
+    UDataObject &next()
+    {
+        if (count == objects.size()) {
+            objects.emplace_back();
+        }
+        return objects[count];
+    }
 };
 
-/// Reads batches of rows ahead of whoever uses them: while one batch is used, the next is read on another thread.
+/// Reads batches of rows ahead of whoever uses them: while one batch is used, the next is read on another thread. The
+/// first one is read by whoever asks for it: a file of a few rows needs no thread.
 class RowBatches
 {
 public:
-    /// @param fill  reads the next rows into a batch. It is called on a thread of its own, never twice at a time, and not
-    ///              any more after the last batch
-    explicit RowBatches(std::function<void(RowBatch &)> fill);
+    /// @param fill  reads the next rows into a batch. It is called on a thread of its own but for the first batch, never
+    ///              twice at a time, and not any more after the last batch
+    explicit RowBatches(std::function<void(RowBatch &)> fill) : fill_(std::move(fill)) {}
     ~RowBatches();
     RowBatches(const RowBatches &) = delete;
     RowBatches &operator=(const RowBatches &) = delete;
@@ -42,13 +52,13 @@ public:
     const RowBatch &next();
 
 private:
-    void read(const std::stop_token &stop);
+    void fill(RowBatch &batch);
+    void readAhead(const std::stop_token &stop);
 
     std::function<void(RowBatch &)> fill_;
     std::array<RowBatch, 2> batches_;
-    std::size_t used_ = 1; ///< the batch that was handed out last
-    bool started_ = false;
-    std::counting_semaphore<3> free_{2}; // and one that lets the thread go at the end
+    std::size_t used_ = 1;               ///< the batch that was handed out last
+    std::counting_semaphore<3> free_{1}; // and one that lets the thread go at the end
     std::counting_semaphore<2> ready_{0};
     std::jthread thread_;
 };

@@ -1,15 +1,24 @@
 #include "TemplateSource.h"
 
+#include "Folders.h"
 #include "TemplateCheck.h"
 #include "TemplateNames.h"
 #include "Xlate.h"
 
+#include <QDir>
 #include <QFileInfo>
 
 namespace kareport
 {
 
-Expected<TemplateFile> readTemplateSource(const QString &path)
+QString templatePath(const Job &job)
+{
+    const QString own = QDir(job.folder).filePath(job.reportTemplate->file);
+    const QString installed = QDir(GetLibraryDir(false)).filePath(job.reportTemplate->file);
+    return QFileInfo::exists(own) || !QFileInfo::exists(installed) ? own : installed;
+}
+
+std::optional<InputError> wrongTemplateSource(const QString &path)
 {
     const QFileInfo info(path);
     if (!info.exists()) {
@@ -24,6 +33,14 @@ Expected<TemplateFile> readTemplateSource(const QString &path)
                           Xlate("the template file has %1 MB: at most %2 MB were expected")
                               .arg(info.size() >> 20)
                               .arg(largestTemplateFile >> 20)};
+    }
+    return std::nullopt;
+}
+
+Expected<TemplateFile> readTemplateSource(const QString &path)
+{
+    if (auto wrong = wrongTemplateSource(path)) {
+        return *std::move(wrong);
     }
     auto file = TemplateFile::read(path);
     if (!file) {

@@ -35,7 +35,10 @@ std::string kindNames()
 /// What the options of `kareport render` are read into.
 struct RenderOptions
 {
-    std::string job;
+    std::vector<std::string> jobs;
+    std::string jobList;
+    std::string slice;
+    bool onlyOutdated = false;
     std::string templateFile;
     std::string templateName;
     std::string table;
@@ -49,9 +52,15 @@ struct RenderOptions
 
     kareport::RenderCommand command() const
     {
-        return {text(job),      {text(templateFile), text(templateName), text(table), text(block), text(data)},
-                texts(outputs), text(as),
-                texts(sets),    progress,
+        return {texts(jobs),
+                text(jobList),
+                text(slice),
+                onlyOutdated,
+                {text(templateFile), text(templateName), text(table), text(block), text(data)},
+                texts(outputs),
+                text(as),
+                texts(sets),
+                progress,
                 quiet};
     }
 };
@@ -59,8 +68,16 @@ struct RenderOptions
 CLI::App *addRender(CLI::App &program, RenderOptions &options)
 {
     CLI::App *render =
-        program.add_subcommand("render", "Make a report from a job file, or from a template and a data file");
-    render->add_option("JOB", options.job, "Job file (JSON)");
+        program.add_subcommand("render", "Make reports from job files, or one from a template and a data file");
+    render->add_option("JOB", options.jobs, "Job file (JSON); several are made one behind the other");
+    render->add_option("--jobs", options.jobList, "File with the name of a job file on each line; - for standard input")
+        ->type_name("FILE");
+    render
+        ->add_option("--slice", options.slice,
+                     "Make only every Nth job, beginning with the Kth: several processes then share a list")
+        ->type_name("K/N");
+    render->add_flag("--update", options.onlyOutdated,
+                     "Leave a job out whose outputs are newer than its job file, template and data");
     render->add_option("-t,--template", options.templateFile, "Template file, instead of a job file")
         ->type_name("FILE");
     render->add_option("-n,--name", options.templateName, "Name of the template in the file")->type_name("NAME");
@@ -72,7 +89,8 @@ CLI::App *addRender(CLI::App &program, RenderOptions &options)
         ->type_name("FILE");
     render
         ->add_option("-o,--output", options.outputs,
-                     "Output file instead of the job's; - for standard output. May stand several times")
+                     "Output file instead of the job's; - for standard output, {} for the job file's name. May stand "
+                     "several times")
         ->type_name("FILE")
         ->allow_extra_args(false);
     render->add_option("--as", options.as, "Kind of the outputs where their names do not say it: " + kindNames())
@@ -88,7 +106,9 @@ CLI::App *addRender(CLI::App &program, RenderOptions &options)
         "  kareport render stakeout.json\n"
         "  kareport render stakeout.json -o - | less\n"
         "  kareport render stakeout.json --set settings.lengthUnit=usft -o stakeout-ft.rep\n"
-        "  kareport render --template survey.xml --name CONTROL --table Points --data points.csv -o points.txt");
+        "  kareport render --template survey.xml --name CONTROL --table Points --data points.csv -o points.txt\n"
+        "  kareport render jobs/*.json -o 'sheets/{}.pdf'\n"
+        "  find jobs -name '*.json' | sort | kareport render --jobs - --slice 1/8 --update");
     return render;
 }
 

@@ -1,0 +1,33 @@
+#pragma once
+
+#include "Commands.h"
+#include "RenderJob.h"
+
+#include <QHash>
+
+namespace kareport
+{
+
+/// Makes the reports of many jobs, one behind the other. A job that fails does not keep the others from being made.
+class RenderBatch
+{
+public:
+    explicit RenderBatch(const RenderCommand &command) : command_(command), progress_(command.progress) {}
+
+    /// @return the greatest status of all jobs
+    ExitStatus run(const QStringList &jobs);
+
+private:
+    ExitStatus make(const QString &path);
+    bool takesFileOfAnother(RenderJob &job, const QString &path);
+    void sayWhatWasDone(qsizetype jobs) const;
+
+    const RenderCommand &command_;
+    Progress progress_;
+    QHash<QString, QString> writers_; ///< output file, job that writes it
+    qsizetype made_ = 0;
+    qsizetype upToDate_ = 0;
+    qsizetype failed_ = 0;
+};
+
+} // namespace kareport

@@ -1,0 +1,38 @@
+#pragma once
+
+#include "Commands.h"
+#include "Job.h"
+#include "JsonNode.h"
+#include "Progress.h"
+
+namespace kareport
+{
+
+/// A job with all that the command line says about it.
+class RenderJob
+{
+public:
+    /// Reads a job. What is wrong with it is said on standard error, and shows in `status`.
+    RenderJob(const RenderCommand &command, Expected<JsonSource> source);
+
+    /// `exitDone` while nothing is wrong with the job.
+    ExitStatus status() const { return status_; }
+    const Job &job() const { return job_; }
+    /// Says that the job cannot be used, before anything of it was written.
+    void fail(const QString &text);
+    /// Whether the job needs a running QGuiApplication.
+    bool needsFonts() const;
+    /// Makes the report and writes its outputs.
+    ExitStatus run(Progress &progress);
+
+private:
+    void takeOutputs(std::optional<OutputKind> kindOtherwise);
+    ExitStatus fail(ExitStatus status, const QString &message);
+
+    const RenderCommand &command_;
+    JsonSource source_;
+    Job job_;
+    ExitStatus status_ = exitDone;
+};
+
+} // namespace kareport
