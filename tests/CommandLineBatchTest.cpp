@@ -68,15 +68,15 @@ TEST(CommandLineBatch, EveryJobIsMade)
         const char *reason;
     };
     constexpr Row rows[] = {
-        {"render a.json b.json", "a.txt=A b.txt=B", "kareport: 2 jobs: 2 made\n", "two names"},
+        {"render a.json b.json", "a.txt=A b.txt=B", "kareport: 2 of 2 jobs made\n", "two names"},
         {"render --quiet a.json b.json", "a.txt=A b.txt=B", "", "and nothing said"},
-        {"render --jobs list", "a.txt=A c.txt=C", "kareport: 2 jobs: 2 made\n", "names in a list"},
-        {"render b.json --jobs list", "a.txt=A b.txt=B c.txt=C", "kareport: 3 jobs: 3 made\n", "both"},
-        {"render a.json b.json c.json --slice 2/2", "b.txt=B", "kareport: 1 jobs: 1 made\n", "a slice"},
-        {"render --jobs list --slice 1/2", "a.txt=A", "kareport: 1 jobs: 1 made\n", "a slice of the list"},
-        {"render a.json --slice 2/2", "", "kareport: 0 jobs: 0 made\n", "a slice without a job"},
-        {"render --jobs empty", "", "kareport: 0 jobs: 0 made\n", "a list without a job"},
-        {"render a.json b.json --set report.0.line=x", "a.txt=x b.txt=x", "kareport: 2 jobs: 2 made\n",
+        {"render --jobs list", "a.txt=A c.txt=C", "kareport: 2 of 2 jobs made\n", "names in a list"},
+        {"render b.json --jobs list", "a.txt=A b.txt=B c.txt=C", "kareport: 3 of 3 jobs made\n", "both"},
+        {"render a.json b.json c.json --slice 2/2", "b.txt=B", "kareport: 1 of 1 jobs made\n", "a slice"},
+        {"render --jobs list --slice 1/2", "a.txt=A", "kareport: 1 of 1 jobs made\n", "a slice of the list"},
+        {"render a.json --slice 2/2", "", "kareport: there was no job to make\n", "a slice without a job"},
+        {"render --jobs empty", "", "kareport: there was no job to make\n", "a list without a job"},
+        {"render a.json b.json --set report.0.line=x", "a.txt=x b.txt=x", "kareport: 2 of 2 jobs made\n",
          "a key that is set counts for all"},
     };
     for (const Row &row : rows) {
@@ -113,39 +113,39 @@ TEST(CommandLineBatch, AJobThatFailsDoesNotKeepTheOthersFromBeingMade)
         {"render a.json none.json b.json",
          2,
          "a.txt=A b.txt=B",
-         {"none.json: error: the file cannot be read", "kareport: 3 jobs: 2 made, 1 failed\n"},
+         {"none.json: error: the file cannot be read", "kareport: 2 of 3 jobs made, 1 failed\n"},
          "no such job"},
         {"render bad.json b.json",
          2,
          "b.txt=B",
-         {"bad.json:1:13: error:", "kareport: 2 jobs: 1 made, 1 failed\n"},
+         {"bad.json:1:13: error:", "kareport: 1 of 2 jobs made, 1 failed\n"},
          "no JSON"},
         {"render unwritable.json b.json",
          3,
          "b.txt=B",
-         {"could not be written", "2 jobs: 1 made, 1 failed\n"},
+         {"could not be written", "1 of 2 jobs made, 1 failed\n"},
          "an output that cannot be written"},
         {"render bad.json unwritable.json bad.json",
          3,
          "",
-         {"3 jobs: 0 made, 3 failed\n"},
+         {"0 of 3 jobs made, 3 failed\n"},
          "the greatest status, whatever comes last"},
         {"render a.json again.json b.json",
          2,
          "a.txt=A b.txt=B",
-         {"again.json: error: ", "a.txt\" is written by the job \"a.json\" already", "3 jobs: 2 made, 1 failed"},
+         {"again.json: error: ", "a.txt\" is written by the job \"a.json\" already", "2 of 3 jobs made, 1 failed"},
          "one file for two reports: the first one stays"},
-        {"render a.json a.json", 2, "a.txt=A", {"2 jobs: 1 made, 1 failed"}, "a job that stands twice"},
-        {"render nodata.json a.json", 2, "a.txt=A", {"none.csv", "2 jobs: 1 made, 1 failed"}, "no data"},
+        {"render a.json a.json", 2, "a.txt=A", {"1 of 2 jobs made, 1 failed"}, "a job that stands twice"},
+        {"render nodata.json a.json", 2, "a.txt=A", {"none.csv", "1 of 2 jobs made, 1 failed"}, "no data"},
         {"render a.json b.json --set report.0.x=1",
          2,
          "",
-         {"unknown key \"x\"", "2 jobs: 0 made, 2 failed"},
+         {"unknown key \"x\"", "0 of 2 jobs made, 2 failed"},
          "a key that no job knows"},
         {"render a.json b.json --set report.7.line=x",
          1,
          "",
-         {"\"report.7.line\"", "2 jobs: 0 made, 2 failed"},
+         {"\"report.7.line\"", "0 of 2 jobs made, 2 failed"},
          "a key that leads nowhere"},
     };
     for (const Row &row : rows) {
@@ -320,11 +320,11 @@ TEST(CommandLineBatch, UpdateMakesWhatIsOlderThanItsSources)
 TEST(CommandLineBatch, UpdateSaysWhatIsUpToDate)
 {
     const BatchFolder folder;
-    EXPECT_EQ(folder.run("render --update a.json b.json").err, "kareport: 2 jobs: 2 made\n");
+    EXPECT_EQ(folder.run("render --update a.json b.json").err, "kareport: 2 of 2 jobs made\n");
     for (const char *name : {"a.json", "b.json", "c.json"}) {
         setTime(folder, name, 0);
     }
-    EXPECT_EQ(folder.run("render --update a.json b.json c.json").err, "kareport: 3 jobs: 1 made, 2 up to date\n");
+    EXPECT_EQ(folder.run("render --update a.json b.json c.json").err, "kareport: 1 of 3 jobs made, 2 up to date\n");
     EXPECT_EQ(folder.run("render --update a.json").err, "kareport: all is up to date; nothing was written\n");
     EXPECT_EQ(folder.run("render --update --quiet a.json").err, "");
     const ProgramRun toTerminal = folder.run("render --update a.json -o -");

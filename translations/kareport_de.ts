@@ -720,6 +720,16 @@
         <translation>mehr als %1 MB kommen aus einer Quelle, die keine Datei ist</translation>
     </message>
     <message>
+        <location filename="../apps/kareport/JobList.cpp"/>
+        <source>standard input cannot be read: %1</source>
+        <translation>die Standardeingabe kann nicht gelesen werden: %1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobList.cpp"/>
+        <source>the list of jobs cannot be read: %1</source>
+        <translation>die Liste der Aufträge kann nicht gelesen werden: %1</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>one of %1 was expected</source>
         <translation>einer dieser Werte wurde erwartet: %1</translation>
@@ -975,9 +985,44 @@
         <translation>kareport: der Bericht ist leer: „%1“ wurde nicht geschrieben</translation>
     </message>
     <message>
+        <location filename="../apps/kareport/RenderBatch.cpp"/>
+        <source>there is not enough memory for this job</source>
+        <translation>für diesen Auftrag reicht der Speicher nicht</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderBatch.cpp"/>
+        <source>"%1" is written by the job "%2" already: an output of its own was expected</source>
+        <translation>„%1“ wird schon vom Auftrag „%2“ geschrieben: eine eigene Ausgabe wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderBatch.cpp"/>
+        <source>kareport: there was no job to make</source>
+        <translation>kareport: es gab keinen Auftrag auszuführen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderBatch.cpp"/>
+        <source>%1 of %2 jobs made</source>
+        <translation>%1 von %2 Aufträgen ausgeführt</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderBatch.cpp"/>
+        <source>%1 up to date</source>
+        <translation>%1 auf dem neuesten Stand</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderBatch.cpp"/>
+        <source>%1 failed</source>
+        <translation>%1 fehlgeschlagen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderBatch.cpp"/>
+        <source>%1 not made when stopped</source>
+        <translation>%1 beim Anhalten nicht ausgeführt</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
-        <source>either a job file or --template, --name, --table or --block, and --data were expected</source>
-        <translation>entweder eine Auftragsdatei wurde erwartet oder --template, --name, --table bzw. --block sowie --data</translation>
+        <source>either job files or --template, --name, --table or --block, and --data were expected</source>
+        <translation>entweder Auftragsdateien oder --template, --name, --table oder --block und --data wurden erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
@@ -986,6 +1031,26 @@
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
+        <source>--slice takes a part of several job files: these were expected</source>
+        <translation>--slice nimmt einen Teil mehrerer Auftragsdateien: diese wurden erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderCommand.cpp"/>
+        <source>--slice "%1": a number, a slash and the count of slices were expected, as in 3/8</source>
+        <translation>--slice "%1": eine Zahl, ein Schrägstrich und die Anzahl der Teile wurden erwartet, wie in 3/8</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderCommand.cpp"/>
+        <source>-o "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
+        <translation>-o "%1" ist eine Datei für mehrere Aufträge: ein Name mit {} wurde erwartet; {} steht für den Namen der Auftragsdatei</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderCommand.cpp"/>
+        <source>kareport: all is up to date; nothing was written</source>
+        <translation>kareport: alles ist auf dem neuesten Stand; nichts wurde geschrieben</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderJob.cpp"/>
         <source>kareport: stopped; nothing was written</source>
         <translation>kareport: abgebrochen; es wurde nichts geschrieben</translation>
     </message>

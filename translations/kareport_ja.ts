@@ -720,6 +720,16 @@
         <translation>ファイルではない入力から %1 MB を超えるデータが読み込まれました</translation>
     </message>
     <message>
+        <location filename="../apps/kareport/JobList.cpp"/>
+        <source>standard input cannot be read: %1</source>
+        <translation>標準入力を読み込めません: %1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobList.cpp"/>
+        <source>the list of jobs cannot be read: %1</source>
+        <translation>ジョブの一覧を読み込めません: %1</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>one of %1 was expected</source>
         <translation>次のいずれかが必要です: %1</translation>
@@ -975,9 +985,44 @@
         <translation>kareport: 帳票が空です: 「%1」は書き込まれませんでした</translation>
     </message>
     <message>
+        <location filename="../apps/kareport/RenderBatch.cpp"/>
+        <source>there is not enough memory for this job</source>
+        <translation>このジョブにはメモリが足りません</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderBatch.cpp"/>
+        <source>"%1" is written by the job "%2" already: an output of its own was expected</source>
+        <translation>"%1" はジョブ "%2" がすでに書き込んでいます: 別の出力が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderBatch.cpp"/>
+        <source>kareport: there was no job to make</source>
+        <translation>kareport: 作成するジョブがありません</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderBatch.cpp"/>
+        <source>%1 of %2 jobs made</source>
+        <translation>%2 件中 %1 件のジョブを作成</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderBatch.cpp"/>
+        <source>%1 up to date</source>
+        <translation>%1 件は最新</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderBatch.cpp"/>
+        <source>%1 failed</source>
+        <translation>%1 件は失敗</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderBatch.cpp"/>
+        <source>%1 not made when stopped</source>
+        <translation>%1 件は中断時に未作成</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
-        <source>either a job file or --template, --name, --table or --block, and --data were expected</source>
-        <translation>ジョブファイル、または --template、--name、--data と --table か --block のどちらかが必要です</translation>
+        <source>either job files or --template, --name, --table or --block, and --data were expected</source>
+        <translation>ジョブファイル、または --template、--name、--table か --block、および --data が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
@@ -986,6 +1031,26 @@
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
+        <source>--slice takes a part of several job files: these were expected</source>
+        <translation>--slice は複数のジョブファイルの一部を選びます: ジョブファイルが必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderCommand.cpp"/>
+        <source>--slice "%1": a number, a slash and the count of slices were expected, as in 3/8</source>
+        <translation>--slice "%1": 3/8 のように、番号、スラッシュ、分割数が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderCommand.cpp"/>
+        <source>-o "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
+        <translation>-o "%1" は複数のジョブに対して 1 つのファイルです: ジョブファイル名を表す {} を含む名前が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderCommand.cpp"/>
+        <source>kareport: all is up to date; nothing was written</source>
+        <translation>kareport: すべて最新です。何も書き込みませんでした</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderJob.cpp"/>
         <source>kareport: stopped; nothing was written</source>
         <translation>kareport: 中断されました。何も書き込まれていません</translation>
     </message>

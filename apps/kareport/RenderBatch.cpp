@@ -74,7 +74,11 @@ bool RenderBatch::takesFileOfAnother(RenderJob &job, const QString &path)
 
 void RenderBatch::sayWhatWasDone(qsizetype jobs) const
 {
-    QStringList parts = {Xlate("%1 made").arg(made_)};
+    if (jobs == 0) {
+        printError(Xlate("kareport: there was no job to make"));
+        return;
+    }
+    QStringList parts = {Xlate("%1 of %2 jobs made").arg(made_).arg(jobs)};
     if (upToDate_ > 0) {
         parts.append(Xlate("%1 up to date").arg(upToDate_));
     }
@@ -82,9 +86,9 @@ void RenderBatch::sayWhatWasDone(qsizetype jobs) const
         parts.append(Xlate("%1 failed").arg(failed_));
     }
     if (const qsizetype left = jobs - made_ - upToDate_ - failed_; left > 0) {
-        parts.append(Xlate("%1 left when stopped").arg(left));
+        parts.append(Xlate("%1 not made when stopped").arg(left));
     }
-    printError(Xlate("kareport: %1 jobs: %2").arg(QString::number(jobs), parts.join(QStringLiteral(", "))));
+    printError(QStringLiteral("kareport: ") + parts.join(QStringLiteral(", ")));
 }
 
 } // namespace kareport
