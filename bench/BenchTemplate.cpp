@@ -1,10 +1,15 @@
 #include "UXmlReportTpl.h"
 
+#include <QFile>
 #include <QTemporaryFile>
 
 #include "PosixProcessorTime.h"
 
 #include <benchmark/benchmark.h>
+#include <libxml/parser.h>
+#include <pugixml.hpp>
+
+#include <memory>
 
 namespace
 {
@@ -34,26 +39,68 @@ QByteArray makeTemplates(qint64 count)
     return text;
 }
 
-/// 200 templates are about 1 MB; compare the bytes a second at 200 and 2000.
-void loadTemplate(benchmark::State &state)
+/// A file of templates in one root, as a parser of XML wants it.
+class TemplatesFile
 {
-    QTemporaryFile file;
-    file.open();
-    const QByteArray text = makeTemplates(state.range(0));
-    file.write(text);
-    file.flush();
-    const QString name = QStringLiteral("t%1").arg(state.range(0) - 1);
+public:
+    explicit TemplatesFile(qint64 count) : text_("<Templates>" + makeTemplates(count) + "</Templates>\n")
+    {
+        file_.open();
+        file_.write(text_);
+        file_.flush();
+    }
+    QString name() const { return file_.fileName(); }
+    qint64 size() const { return text_.size(); }
+
+private:
+    QByteArray text_;
+    QTemporaryFile file_;
+};
+
+/// Reads a file of 200 templates, about 1 MB, and another of ten times as many; compare the bytes a second.
+template <typename Read>
+void readTemplates(benchmark::State &state, Read read)
+{
+    const TemplatesFile file(state.range(0));
     const ProcessorTime time;
     for (auto _ : state) {
-        UXmlReportTpl reportTemplate;
-        if (!reportTemplate.LoadTemplate(file.fileName(), name)) {
-            state.SkipWithError("the template was not loaded");
+        if (!read(file.name())) {
+            state.SkipWithError("the file was not read");
         }
     }
-    state.SetBytesProcessed(state.iterations() * text.size());
-    time.report(state, static_cast<double>(text.size()));
+    state.SetBytesProcessed(state.iterations() * file.size());
+    time.report(state, static_cast<double>(file.size()));
+}
+
+/// The last template, behind all others.
+void loadTemplate(benchmark::State &state)
+{
+    readTemplates(state, [name = QStringLiteral("t%1").arg(state.range(0) - 1)](const QString &path) {
+        UXmlReportTpl reportTemplate;
+        return reportTemplate.LoadTemplate(path, name);
+    });
 }
 BENCHMARK(loadTemplate)->Arg(200)->Arg(2000)->Unit(benchmark::kMillisecond);
+
+/// The same file read by parsers of XML, which keep all of it and compare no names.
+void parsePugixml(benchmark::State &state)
+{
+    readTemplates(state, [](const QString &path) {
+        pugi::xml_document document;
+        return bool(document.load_file(QFile::encodeName(path).constData()));
+    });
+}
+BENCHMARK(parsePugixml)->Arg(200)->Arg(2000)->Unit(benchmark::kMillisecond);
+
+void parseLibxml2(benchmark::State &state)
+{
+    readTemplates(state, [](const QString &path) {
+        const std::unique_ptr<xmlDoc, decltype(&xmlFreeDoc)> document(
+            xmlReadFile(QFile::encodeName(path).constData(), nullptr, 0), &xmlFreeDoc);
+        return document != nullptr;
+    });
+}
+BENCHMARK(parseLibxml2)->Arg(200)->Arg(2000)->Unit(benchmark::kMillisecond);
 
 /// One table whose fields end with the short closing tag; compare the rates at N and 10 N.
 void loadManyFields(benchmark::State &state)

@@ -2,6 +2,7 @@
 //
 //   ka_file_work save TEXT OUT    TEXT (UTF-16LE) is put into a report; the time of saving it as OUT
 //   ka_file_work load IN          the time of loading a report file
+//   ka_file_work copy IN OUT      the time of writing the bytes of IN as OUT: what any saving must take
 //   ka_file_work pdf IN OUT       IN is loaded; the time of writing it as a PDF, 72 lines a page
 //
 // Prints the seconds and the peak memory of the process in KB.
@@ -51,6 +52,13 @@ int main(int argc, char **argv)
     if (verb == QByteArrayView("load") && argc == 3) {
         return say([&] { return report.LoadFile(QFile::decodeName(argv[2]), true) == 1; });
     }
+    if (verb == QByteArrayView("copy") && argc == 4) {
+        const QByteArray bytes = contentOf(argv[2]);
+        return say([&] {
+            return kareport::replaceFile(QFile::decodeName(argv[3]),
+                                         [&](QIODevice &device) { return device.write(bytes) == bytes.size(); });
+        });
+    }
     if (verb == QByteArrayView("pdf") && argc == 4) {
         report.FixPage(72, 80);
         report.SetPageSize();
@@ -66,6 +74,6 @@ int main(int argc, char **argv)
                                          [&](QIODevice &device) { return report.WritePdf(device); });
         });
     }
-    std::fputs("ka_file_work save TEXT OUT | load IN | pdf IN OUT\n", stderr);
+    std::fputs("ka_file_work save TEXT OUT | load IN | copy IN OUT | pdf IN OUT\n", stderr);
     return 1;
 }

@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # Installs the Debian packages that a task needs and that are not there yet.
 #
-#   scripts/packages.sh build|test|docs|package|office|bench|tidy|coverage [...]
+#   scripts/packages.sh build|test|docs|package|office|bench|compare|tidy|coverage [...]
 #
 # Every package stands here once, with the reason for it. Nothing is asked of apt when all are installed.
 set -euo pipefail
@@ -31,6 +31,7 @@ packages_test=(
     fonts-liberation2       # a second fixed-pitch face
     fonts-wqy-zenhei        # a face with CJK
     qt6-translations-l10n   # Qt's own texts in other languages
+    parallel                # spreads a batch of jobs over processes and machines
 )
 packages_docs=(
     doxygen                 # the pages of the public headers
@@ -43,10 +44,18 @@ packages_office=(
 )
 packages_bench=(
     libbenchmark-dev        # micro benchmarks
-    mawk                    # compared against
-    time                    # peak memory of a process
-    python3                 # the whole-process runs
-    python3-reportlab       # PDF compared against
+    libpugixml-dev libxml2-dev # template files compared against XML parsers
+)
+packages_compare=(
+    python3                 # runs the programs and writes the page
+    python3-matplotlib      # its pictures
+    mawk gawk sqlite3 miller # rows to text
+    python3-reportlab enscript ghostscript # pages to PDF
+    libreoffice-writer-nogui # pages to PDF, rich text
+    pandoc unrtf            # rich text
+    featherpad              # a text editor
+    xvfb python3-xlib       # a screen that is watched
+    parallel                # a batch over processes
 )
 packages_tidy=(
     clang-tidy
