@@ -1,6 +1,7 @@
 #include "FieldFormatter.h"
 #include "FixedNotation.h"
 #include "VariableType.h"
+#include "WideVectors.h"
 
 #include <benchmark/benchmark.h>
 
@@ -50,6 +51,7 @@ void formatField(benchmark::State &state)
     kareport::TextBuffer out;
     double value = 0;
     for (auto _ : state) {
+        kareport::endWideVectors(); // as before each row
         out.clear();
         value = nextValue(value);
         formatter.append(out, options, 8, &value, QStringView());

@@ -7,7 +7,6 @@
 #include <array>
 #include <cstdint>
 #include <cstring>
-#include <vector>
 
 namespace kareport
 {
@@ -140,40 +139,63 @@ std::size_t ReportTextEncoder::encodeCharacters(const Character *at, const Chara
 
 namespace
 {
-
 constexpr qsizetype pieceSize = 64 * 1024;
+}
+
+bool ReportTextWriter::writeBytes(const char *bytes, std::size_t size)
+{
+    hasFailed_ = hasFailed_ || device_.write(bytes, static_cast<qint64>(size)) != static_cast<qint64>(size);
+    return !hasFailed_;
+}
 
 template <typename Text>
-bool writePieces(QIODevice &device, Text text, LineEnds lineEnds)
+bool ReportTextWriter::writePieces(Text text, bool last)
 {
-    if (lineEnds == LineEnds::ReportFile &&
-        device.write(reportFileMark, sizeof reportFileMark) != qint64(sizeof reportFileMark))
-    {
-        return false;
+    if (!hasBegun_) {
+        hasBegun_ = true;
+        if (lineEnds_ == LineEnds::ReportFile) {
+            writeBytes(reportFileMark, sizeof reportFileMark);
+        }
+        bytes_.resize(ReportTextEncoder::bound(pieceSize));
     }
-    ReportTextEncoder encoder(lineEnds);
-    std::vector<char> bytes(ReportTextEncoder::bound(pieceSize));
-    for (qsizetype at = 0; at < text.size(); at += pieceSize) {
+    isEmpty_ = isEmpty_ && text.isEmpty();
+    qsizetype at = 0;
+    do {
         const qsizetype count = std::min(pieceSize, text.size() - at);
-        const auto size =
-            static_cast<qint64>(encoder.encode(text.sliced(at, count), bytes.data(), at + count == text.size()));
-        if (device.write(bytes.data(), size) != size) {
+        const bool isLast = last && at + count == text.size();
+        if (!writeBytes(bytes_.data(), encoder_.encode(text.sliced(at, count), bytes_.data(), isLast))) {
             return false;
         }
-    }
+        at += count;
+    } while (at < text.size());
     return true;
 }
 
-} // namespace
+bool ReportTextWriter::write(QStringView text)
+{
+    return writePieces(text, false);
+}
+
+bool ReportTextWriter::write(QLatin1StringView text)
+{
+    return writePieces(text, false);
+}
+
+bool ReportTextWriter::finish()
+{
+    return writePieces(QStringView(), true);
+}
 
 bool writeReportText(QIODevice &device, QStringView text, LineEnds lineEnds)
 {
-    return writePieces(device, text, lineEnds);
+    ReportTextWriter writer(device, lineEnds);
+    return writer.write(text) && writer.finish();
 }
 
 bool writeReportText(QIODevice &device, QLatin1StringView text, LineEnds lineEnds)
 {
-    return writePieces(device, text, lineEnds);
+    ReportTextWriter writer(device, lineEnds);
+    return writer.write(text) && writer.finish();
 }
 
 } // namespace kareport

@@ -1,5 +1,7 @@
 #include "DataWriter.h"
 
+#include "WideVectors.h"
+
 namespace kareport
 {
 
@@ -111,6 +113,7 @@ void DataWriter::writeRows(const UXmlReportTable &table, UDataObjectList &list)
 
 void DataWriter::formatRow(const std::vector<FieldFormatter> &fields, const UDataObject &object)
 {
+    endWideVectors();
     row_.clear();
     QStringView suffix;
     for (const FieldFormatter &field : fields) {

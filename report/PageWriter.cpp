@@ -29,6 +29,13 @@ void PageWriter::clear()
     noteChange();
 }
 
+bool PageWriter::emptyIntoOutlet()
+{
+    const bool isTaken = text_.isNarrow() ? outlet_->write(text_.narrowView()) : outlet_->write(text_.view());
+    text_.drain();
+    return isTaken;
+}
+
 bool PageWriter::write(QStringView text, int style)
 {
     if (text_.owns(text)) {
@@ -44,6 +51,7 @@ bool PageWriter::write(QStringView text, int style)
     if (observer_ != nullptr && !text.isEmpty()) {
         observer_->textWritten(text, style);
     }
+    noteGrowth();
     return true;
 }
 
@@ -59,6 +67,7 @@ void PageWriter::lineFeed(qint64 count)
         }
         ++lineNumber_;
         ++lineCount_;
+        noteGrowth();
     }
 }
 

@@ -2,6 +2,7 @@
 
 #include "KaReportExport.h"
 #include "ReportText.h"
+#include "ReportTextCodec.h"
 
 #include <QString>
 #include <QStringView>
@@ -39,6 +40,12 @@ public:
 
     ReportText &text() { return text_; }
     const ReportText &text() const { return text_; }
+
+    /// Hands the text on while it is written, so that `text` never holds more than its end; null keeps the text. The outlet
+    /// must live until another one, or null, is set. `clear` does not take back what was handed on.
+    void setOutlet(ReportTextWriter *outlet) { outlet_ = outlet; }
+    /// Hands on what is left. @return whether all of the text was taken
+    bool emptyIntoOutlet();
 
     /// Whether a part of what was to be written since the last `clear` is missing, for want of memory.
     bool hasLostText() const { return hasLostText_; }
@@ -84,10 +91,19 @@ public:
     void noteChange();
 
 private:
-    static constexpr int headerGap = 4; ///< line ends behind the header line
+    static constexpr int headerGap = 4;                    ///< line ends behind the header line
+    static constexpr qint64 mostBeforeOutlet = 256 * 1024; ///< characters: few enough to be near the processor
+
+    void noteGrowth()
+    {
+        if (outlet_ != nullptr && text_.size() >= mostBeforeOutlet) {
+            emptyIntoOutlet();
+        }
+    }
 
     PageWriterObserver *observer_;
     ReportText text_;
+    ReportTextWriter *outlet_ = nullptr;
     bool hasLostText_ = false;
     int lineNumber_ = 0;
     int lineCount_ = 0;

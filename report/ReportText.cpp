@@ -136,8 +136,7 @@ bool ReportText::appendLineEnd()
 bool ReportText::assign(QStringView text)
 {
     const QString copy = text.toString(); // it may be a piece of this very text
-    pending_.clear();
-    (isNarrow_ ? narrow_.setSize(0) : wide_.setSize(0));
+    drain();
     return append(copy);
 }
 
@@ -163,6 +162,12 @@ bool ReportText::replace(qint64 at, qint64 removed, QStringView inserted)
     }
     settle();
     return replaceNow(at, removed, inserted);
+}
+
+void ReportText::drain()
+{
+    pending_.clear();
+    (isNarrow_ ? narrow_.setSize(0) : wide_.setSize(0));
 }
 
 void ReportText::clear()

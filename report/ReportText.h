@@ -59,6 +59,8 @@ public:
     bool replace(qint64 at, qint64 removed, QStringView inserted);
     /// Empties the text and goes back to one block.
     void clear();
+    /// Empties the text and keeps its memory, for what is written next.
+    void drain();
 
 private:
     static constexpr std::size_t mostPending = 4096;        ///< edits

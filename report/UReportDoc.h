@@ -62,6 +62,12 @@ public:
     bool HasLostText() const { return page_.hasLostText(); }
     /// Writes the text to an open device, in UTF-8. @return false as soon as a write fails
     bool WriteText(QIODevice &device, kareport::LineEnds lineEnds) const;
+    /// Hands the text on to a writer while it is written, so that a report that only becomes a file may be longer than there
+    /// is memory: the document then holds no more than its end, and `Clear` does not take back what was handed on. Null
+    /// keeps the text. The writer must live until `EndTextStream`, or until another one or null is set.
+    void StreamText(kareport::ReportTextWriter *writer) { page_.setOutlet(writer); }
+    /// Hands the rest on, ends the writer's text and keeps the text from now on. @return whether the writer has all of it
+    bool EndTextStream(kareport::ReportTextWriter &writer);
     /// Writes the text to an open device as a PDF. @param notes  receives what is missing or went wrong; may be null
     /// @param progress  is told the pages done and all pages; its false stops the work. May be empty
     /// @return false when there is no measured page or no font, a write fails, or the work was stopped

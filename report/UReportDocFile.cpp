@@ -137,6 +137,14 @@ bool UReportDoc::WriteText(QIODevice &device, kareport::LineEnds lineEnds) const
                            : kareport::writeReportText(device, text.view(), lineEnds);
 }
 
+bool UReportDoc::EndTextStream(kareport::ReportTextWriter &writer)
+{
+    page_.setOutlet(&writer);
+    const bool isTaken = page_.emptyIntoOutlet();
+    page_.setOutlet(nullptr);
+    return isTaken && writer.finish() && !HasLostText();
+}
+
 bool UReportDoc::WritePdf(QIODevice &device, kareport::PdfNotes *notes,
                           const std::function<bool(qint64, qint64)> &progress) const
 {

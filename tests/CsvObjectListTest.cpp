@@ -72,11 +72,12 @@ TEST(CsvObjectList, ReadsALongFileInTurn)
 
 TEST(CsvObjectList, GoesBackAndForth)
 {
-    constexpr std::size_t count = 3000;
+    // Three batches: the first is read by whoever asks, the others ahead of it.
+    constexpr std::size_t batch = kareport::RowBatch::most;
+    constexpr std::size_t count = 2 * batch + 1000;
     const CsvFile file(numberedRows(count));
-    for (const std::size_t index :
-         {std::size_t(2999), std::size_t(0), std::size_t(511), std::size_t(512), std::size_t(511), std::size_t(1600),
-          std::size_t(1599), std::size_t(3000), std::size_t(2999), std::size_t(0)})
+    for (const std::size_t index : {count - 1, std::size_t(0), batch - 1, batch, batch - 1, batch + 600, batch + 599,
+                                    2 * batch - 1, 2 * batch, count, count - 1, std::size_t(0)})
     {
         EXPECT_EQ(textOf(file.list->GetAt(index)), index < count ? numberedRow(index) : QStringLiteral("null"));
     }
@@ -84,6 +85,21 @@ TEST(CsvObjectList, GoesBackAndForth)
     for (int i = 0; i < 20; ++i) {
         const std::size_t index = random() % count;
         EXPECT_EQ(textOf(file.list->GetAt(index)), numberedRow(index));
+    }
+}
+
+TEST(CsvObjectList, EndsWithItsBatch)
+{
+    // One row less than a batch holds, as many, and one more; and two batches.
+    constexpr std::size_t batch = kareport::RowBatch::most;
+    for (const std::size_t count : {batch - 1, batch, batch + 1, 2 * batch}) {
+        const CsvFile file(numberedRows(static_cast<int>(count)));
+        for (int round = 0; round < 2; ++round) {
+            EXPECT_EQ(textOf(file.list->GetAt(0)), numberedRow(0)) << count;
+            EXPECT_EQ(textOf(file.list->GetAt(count - 1)), numberedRow(count - 1)) << count;
+            EXPECT_EQ(file.list->GetAt(count), nullptr) << count;
+        }
+        EXPECT_FALSE(file.list->error()) << count;
     }
 }
 

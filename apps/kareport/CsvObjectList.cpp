@@ -2,6 +2,7 @@
 
 #include "EntryOrder.h"
 #include "TemplateText.h"
+#include "WideVectors.h"
 #include "Xlate.h"
 
 #include <QHash>
@@ -141,6 +142,7 @@ bool CsvObjectList::readRow(RowBatch &batch)
         batch.error = reader_.error();
         return false;
     }
+    endWideVectors();
     batch.error = storeCells(batch.next(), nullptr);
     batch.count += batch.error ? 0U : 1U;
     return !batch.error;

@@ -28,7 +28,7 @@ public:
         for (const Job::Step &step : runner_.job_.steps) {
             path_ = step.path;
             std::visit(*this, step.action);
-            if (error_ || runner_.source_.failed() || isInterrupted()) {
+            if (error_ || runner_.source_.failed() || runner_.isStopped()) {
                 break;
             }
             if (report_.HasLostText()) {
@@ -58,7 +58,7 @@ public:
         }
         const bool isGood = list && !takeError(list.get());
         const UDataObject *object = isGood ? list->GetAt(0) : nullptr;
-        if (isGood && object == nullptr && !isInterrupted()) {
+        if (isGood && object == nullptr && !runner_.isStopped()) {
             failWithoutRow(step.data);
         }
         if (object != nullptr && !failed()) {
@@ -147,9 +147,9 @@ private:
         }
         Progress &progress = runner_.progress_;
         progress.begin(Xlate("Reading %1").arg(QFileInfo(set.csv).fileName()), bytes->view().size());
-        return std::make_unique<CsvObjectList>(bytes, set.delimiter, findVariable, [&progress](std::size_t read) {
+        return std::make_unique<CsvObjectList>(bytes, set.delimiter, findVariable, [this, &progress](std::size_t read) {
             progress.advance(read);
-            return !isInterrupted();
+            return !runner_.isStopped();
         });
     }
 
@@ -206,12 +206,19 @@ JobRunner::JobRunner(const Job &job, JsonSource &source, Progress &progress, Mak
 
 JobRunner::~JobRunner() = default;
 
-std::optional<InputError> JobRunner::run()
+std::optional<InputError> JobRunner::run(ReportTextWriter *stream)
 {
+    stream_ = stream;
     if (auto error = prepare()) {
         return error;
     }
+    report_->StreamText(stream);
     return Steps(*this).run();
+}
+
+bool JobRunner::isStopped() const
+{
+    return isInterrupted() || (stream_ != nullptr && stream_->hasFailed());
 }
 
 std::optional<InputError> JobRunner::prepare()

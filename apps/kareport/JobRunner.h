@@ -30,8 +30,10 @@ public:
     /// Whether a page has to be measured with a font, which needs a running QGuiApplication.
     static bool needsFonts(const Job &job) { return !job.page.linesPerPage || !job.page.charsPerRow; }
 
+    /// @param stream  receives the text while it is written, where no step takes text back; null keeps it in the report. Once
+    ///                it has failed, no more is made
     /// @return what is wrong with the job's template or data; nothing when the report has been made or was interrupted
-    std::optional<InputError> run();
+    std::optional<InputError> run(ReportTextWriter *stream = nullptr);
     UReportDoc &report() { return *report_; }
     /// The same while it may not have been made: null then.
     UReportDoc *madeReport() { return report_; }
@@ -42,6 +44,7 @@ private:
     std::optional<InputError> prepare();
     std::optional<InputError> loadTemplate();
     void applyOptions();
+    bool isStopped() const;
 
     const Job &job_;
     JsonSource &source_;
@@ -50,6 +53,7 @@ private:
     MakeReport make_;
     std::optional<UApplication> application_; ///< of a program that has none
     UReportDoc *report_ = nullptr;            ///< owned by its document template
+    ReportTextWriter *stream_ = nullptr;
 };
 
 } // namespace kareport

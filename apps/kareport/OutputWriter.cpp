@@ -39,12 +39,8 @@ public:
             // Saving an empty report makes no file.
             return std::nullopt;
         }
-        QString error;
-        const bool done = replaceFile(
-            output_.file, [this](QIODevice &device) { return writeTo(device); }, &error);
-        return done ? std::nullopt
-                    : std::optional(Xlate("\"%1\" could not be written: %2")
-                                        .arg(output_.file, problem_.isEmpty() ? error : problem_));
+        return replaceOutput(
+            output_, [this](QIODevice &device) { return writeTo(device); }, problem_);
     }
 
 private:
@@ -100,6 +96,16 @@ private:
 };
 
 } // namespace
+
+std::optional<QString> replaceOutput(const Output &output, const std::function<bool(QIODevice &)> &write,
+                                     const QString &problem)
+{
+    QString error;
+    return replaceFile(output.file, write, &error)
+               ? std::nullopt
+               : std::optional(
+                     Xlate("\"%1\" could not be written: %2").arg(output.file, problem.isEmpty() ? error : problem));
+}
 
 std::optional<QString> writeOutput(UReportDoc &report, const Output &output, Progress &progress, QStringList &warnings)
 {

@@ -26,6 +26,18 @@ bool needsFonts(const std::vector<Output> &outputs)
                        [](const Output &output) { return output.kind == OutputKind::RichText; });
 }
 
+ExitStatus sayWritten(const Output &output, const std::optional<QString> &error, bool isEmpty, bool quiet)
+{
+    if (error) {
+        printError(QStringLiteral("kareport: ") + *error);
+        return exitOutput;
+    }
+    if (!quiet && isEmpty && output.kind == OutputKind::Report) {
+        printError(Xlate("kareport: the report is empty: \"%1\" was not written").arg(output.file));
+    }
+    return exitDone;
+}
+
 ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, Progress &progress, bool quiet)
 {
     ExitStatus status = exitDone;
@@ -45,12 +57,7 @@ ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, 
         for (const QString &warning : quiet ? QStringList() : warnings) {
             printError(Xlate("kareport: warning: \"%1\": %2").arg(output.file, warning));
         }
-        if (error) {
-            printError(QStringLiteral("kareport: ") + *error);
-            status = exitOutput;
-        } else if (!quiet && report.IsEmpty() && output.kind == OutputKind::Report) {
-            printError(Xlate("kareport: the report is empty: \"%1\" was not written").arg(output.file));
-        }
+        status = std::max(status, sayWritten(output, error, report.IsEmpty(), quiet));
     }
     return status;
 }

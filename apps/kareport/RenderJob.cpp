@@ -3,11 +3,13 @@
 #include "CommandSetup.h"
 #include "Interrupt.h"
 #include "JobReader.h"
-#include "JobRunner.h"
+#include "OutputWriter.h"
 #include "OutputsWriter.h"
 #include "Xlate.h"
 
 #include <QFileInfo>
+
+#include <algorithm>
 
 namespace kareport
 {
@@ -64,21 +66,74 @@ ExitStatus RenderJob::fail(ExitStatus status, const QString &message)
     return status;
 }
 
-ExitStatus RenderJob::run(Progress &progress)
+/// The output that the text of the report can go to while it is written; null when the whole report must be there first:
+/// for any other kind, for several outputs, for what is no file and so cannot be taken back, and for a report that is
+/// emptied on the way.
+const Output *RenderJob::streamedOutput() const
 {
-    JobRunner runner(job_, source_, progress);
-    const auto error = runner.run();
-    progress.finish();
+    const Output &output = job_.outputs.front();
+    const QFileInfo file(output.file);
+    const bool isText = output.kind == OutputKind::Report || output.kind == OutputKind::Text;
+    const bool isFile = !output.isStandardOutput() && (file.isFile() || !file.exists());
+    const bool isEmptied = std::any_of(job_.steps.begin(), job_.steps.end(), [](const Job::Step &step) {
+        return std::holds_alternative<Job::Clear>(step.action);
+    });
+    return job_.outputs.size() == 1 && isText && isFile && !isEmptied ? &output : nullptr;
+}
+
+ExitStatus RenderJob::madeStatus(const std::optional<InputError> &error)
+{
     if (isInterrupted()) {
         if (!command_.isBatch()) {
             printError(Xlate("kareport: stopped; nothing was written"));
         }
-        return status_ = exitInterrupted;
+        return exitInterrupted;
     }
-    if (error) {
-        return fail(exitInput, error->message());
+    return error ? fail(exitInput, error->message()) : exitDone;
+}
+
+/// Makes the report straight into its output. @return nothing, and nothing made, when the output cannot be opened
+std::optional<ExitStatus> RenderJob::runIntoOutput(JobRunner &runner, const Output &output, Progress &progress)
+{
+    bool isOpen = false;
+    bool isEmpty = false;
+    std::optional<InputError> inputError;
+    auto outputError = replaceOutput(output, [&](QIODevice &device) {
+        isOpen = true;
+        ReportTextWriter writer(device, output.kind == OutputKind::Report ? LineEnds::ReportFile : LineEnds::PlainText);
+        inputError = runner.run(&writer);
+        if (inputError || isInterrupted()) {
+            return false;
+        }
+        const bool isWritten = runner.report().EndTextStream(writer);
+        isEmpty = isWritten && writer.isEmpty();
+        return isWritten && !(isEmpty && output.kind == OutputKind::Report); // an empty report makes no file
+    });
+    if (!isOpen) {
+        return std::nullopt;
     }
-    return status_ = writeOutputs(runner.report(), job_.outputs, progress, command_.quiet);
+    progress.finish();
+    if (const ExitStatus made = madeStatus(inputError); made != exitDone) {
+        return made;
+    }
+    return sayWritten(output, isEmpty ? std::nullopt : outputError, isEmpty, command_.quiet);
+}
+
+ExitStatus RenderJob::run(Progress &progress)
+{
+    JobRunner runner(job_, source_, progress);
+    if (const Output *output = streamedOutput()) {
+        if (const auto status = runIntoOutput(runner, *output, progress)) {
+            return status_ = *status;
+        }
+    }
+    const auto error = runner.run();
+    progress.finish();
+    status_ = madeStatus(error);
+    if (status_ == exitDone) {
+        status_ = writeOutputs(runner.report(), job_.outputs, progress, command_.quiet);
+    }
+    return status_;
 }
 
 } // namespace kareport

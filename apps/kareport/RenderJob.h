@@ -2,6 +2,7 @@
 
 #include "Commands.h"
 #include "Job.h"
+#include "JobRunner.h"
 #include "JsonNode.h"
 #include "Progress.h"
 
@@ -26,6 +27,10 @@ public:
     ExitStatus run(Progress &progress);
 
 private:
+    const Output *streamedOutput() const;
+    /// How making the report ended, before its outputs are looked at.
+    ExitStatus madeStatus(const std::optional<InputError> &error);
+    std::optional<ExitStatus> runIntoOutput(JobRunner &runner, const Output &output, Progress &progress);
     void takeOutputs(std::optional<OutputKind> kindOtherwise);
     ExitStatus fail(ExitStatus status, const QString &message);
 

@@ -17,7 +17,7 @@ namespace kareport
 /// Rows that were read one behind the other. The objects are kept and refilled from batch to batch.
 struct RowBatch
 {
-    static constexpr std::size_t most = 512;
+    static constexpr std::size_t most = 2048;
     static constexpr std::size_t mostBytes = std::size_t(1) << 20; ///< of the file, and one row more
 
     std::vector<UDataObject> objects; ///< as many as were ever in use

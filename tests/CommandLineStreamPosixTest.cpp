@@ -1,0 +1,88 @@
+#include "CommandLine.h"
+
+#include <QElapsedTimer>
+
+#include <csignal>
+#include <sys/resource.h>
+#include <sys/stat.h>
+
+#include <gtest/gtest.h>
+
+namespace
+{
+
+/// A job of rows that make about 40 MB of text.
+class LongJob : public CommandLineFolder
+{
+public:
+    explicit LongJob(const char *output)
+    {
+        QByteArray csv = "Number,Northing\n";
+        for (int i = 0; i < 1'500'000; ++i) {
+            csv += "1,2.5\n";
+        }
+        put("points.csv", csv);
+        put("job.json", bytesOf("job.json").replace("]}\n", QByteArray("], \"output\": [\"") + output + "\"]}"));
+    }
+};
+
+TEST(CommandLineStream, AFullDiskLeavesTheOldFileAndIsSaidAtOnce)
+{
+    const LongJob folder("out.rep");
+    folder.put("out.rep", "kept");
+    QProcess process;
+    process.setWorkingDirectory(folder.path());
+    process.setChildProcessModifier([] {
+        std::signal(SIGXFSZ, SIG_IGN);
+        const rlimit limit = {1 << 20, 1 << 20};
+        setrlimit(RLIMIT_FSIZE, &limit);
+    });
+    QElapsedTimer timer;
+    timer.start();
+    process.start(QStringLiteral(KAREPORT_PROGRAM), words("render job.json --progress"), QIODevice::ReadOnly);
+    ASSERT_TRUE(process.waitForFinished(60'000));
+    const QByteArray err = process.readAllStandardError();
+    EXPECT_EQ(process.exitCode(), 3) << err.constData();
+    EXPECT_TRUE(err.contains("out.rep\" could not be written: ")) << err.constData();
+    EXPECT_FALSE(err.contains("100 %")) << "the rest of the rows was not read for nothing";
+    EXPECT_EQ(folder.bytesOf("out.rep"), "kept");
+    EXPECT_EQ(folder.names(), words("job.json out.rep points.csv t.xml"));
+}
+
+TEST(CommandLineStream, WhatIsNoFileGetsTheWholeReportOrNothing)
+{
+    const CommandLineFolder folder;
+    ASSERT_EQ(mkfifo(qPrintable(folder.path("out.txt")), 0600), 0);
+    folder.put("points.csv", "Number,Northing\n1,x\n");
+    folder.put("job.json", folder.bytesOf("job.json").replace("]}\n", "], \"output\": [\"out.txt\"]}"));
+    // Nobody reads the pipe: opening it would wait for ever.
+    const ProgramRun run = folder.run("render job.json");
+    EXPECT_EQ(run.status, 2) << run.all().constData();
+}
+
+TEST(CommandLineStream, StoppedInTheMiddleTheOldFileStays)
+{
+    const LongJob folder("out.rep");
+    folder.put("out.rep", "kept");
+    for (const int signal : {SIGINT, SIGTERM, SIGKILL}) {
+        QProcess process;
+        process.setWorkingDirectory(folder.path());
+        process.start(QStringLiteral(KAREPORT_PROGRAM), words("render job.json --progress"), QIODevice::ReadOnly);
+        QByteArray err;
+        // Until the first rows were read, which shows.
+        process.setReadChannel(QProcess::StandardError);
+        while (!err.contains('%') && process.waitForReadyRead(30'000)) {
+            err += process.readAllStandardError();
+        }
+        kill(static_cast<pid_t>(process.processId()), signal);
+        ASSERT_TRUE(process.waitForFinished(60'000)) << signal;
+        if (signal != SIGKILL) {
+            EXPECT_EQ(process.exitCode(), 130) << signal;
+            EXPECT_TRUE((err + process.readAllStandardError()).contains("stopped; nothing was written")) << signal;
+        }
+        EXPECT_EQ(folder.bytesOf("out.rep"), "kept") << signal;
+        EXPECT_EQ(folder.names(), words("job.json out.rep points.csv t.xml")) << signal;
+    }
+}
+
+} // namespace
