@@ -50,20 +50,35 @@ ScanText ScanText::sliced(qsizetype from, qsizetype count) const
     return slice;
 }
 
+void ScanText::removeRuns(qsizetype from, qsizetype count)
+{
+    const qsizetype behind = from + count;
+    const auto firstGone = std::lower_bound(runs_.begin(), runs_.end(), from,
+                                            [](const Run &run, qsizetype wanted) { return run.at < wanted; });
+    if (behind >= size()) {
+        // With nothing left at all, the first run says where the text stood.
+        runs_.erase(firstGone == runs_.begin() ? firstGone + 1 : firstGone, runs_.end());
+        return;
+    }
+    const auto last = runs_.begin() + static_cast<std::ptrdiff_t>(runAt(behind));
+    const Run rest = {from, last->source + (behind - last->at)};
+    for (auto run = last + 1; run != runs_.end(); ++run) {
+        run->at -= count;
+    }
+    if (firstGone > last) {
+        runs_.insert(firstGone, rest);
+    } else {
+        *firstGone = rest;
+        runs_.erase(firstGone + 1, last + 1);
+    }
+}
+
 void ScanText::remove(qsizetype from, qsizetype count)
 {
-    const ScanText rest = sliced(from + count, size() - from - count);
-    *this = sliced(0, from);
-    text_.append(rest.text_);
-    for (const Run &run : rest.runs_) {
-        if (run.at < rest.size()) {
-            runs_.push_back({from + run.at, run.source});
-        }
+    if (!runs_.empty()) {
+        removeRuns(from, count);
     }
-    // With nothing before the cut, the run that stood at the front holds no character any more.
-    if (from == 0 && runs_.size() > 1) {
-        runs_.erase(runs_.begin());
-    }
+    text_.remove(from, count);
 }
 
 } // namespace kareport

@@ -43,6 +43,7 @@ private:
     };
 
     std::size_t runAt(qsizetype position) const;
+    void removeRuns(qsizetype from, qsizetype count);
 
     QString text_;
     std::vector<Run> runs_;

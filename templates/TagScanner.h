@@ -63,6 +63,8 @@ public:
     std::optional<ScanElement> next();
 
 private:
+    static constexpr qsizetype notSearched = -2;
+
     struct Opening
     {
         qsizetype at;    ///< position of the tag; before `position_` when it begins in what was kept
@@ -81,7 +83,7 @@ private:
     qsizetype position_ = 0; ///< what stands before it was kept or cut out
     QString kept_;           ///< what was kept so far: a cut can join its end with what follows to a tag
     qsizetype closing_ = -1;
-    qsizetype shortClosing_ = -1;
+    qsizetype shortClosing_ = notSearched; ///< looked for once it is needed: a file without any is walked to its end
 };
 
 } // namespace kareport

@@ -3,6 +3,7 @@
 #include "KaReportExport.h"
 #include "ScanText.h"
 
+#include <QByteArray>
 #include <QByteArrayView>
 #include <QString>
 
@@ -20,6 +21,8 @@ public:
 
     /// Reads a file; nothing when it cannot be opened or read.
     static std::optional<TemplateFile> read(const QString &path);
+    /// Reads a file's text as it is scanned, for whoever need not say where in the file something stands.
+    static std::optional<QString> readScanned(const QString &path);
 
     /// The text as it stands.
     const QString &text() const { return text_; }

@@ -36,13 +36,13 @@ UXmlReportTpl::~UXmlReportTpl() = default;
 
 bool UXmlReportTpl::LoadTemplate(const QString &fileName, const QString &templateName)
 {
-    const auto file = kareport::TemplateFile::read(fileName);
-    if (!file || templateName.isEmpty()) {
+    const auto text = kareport::TemplateFile::readScanned(fileName);
+    if (!text || templateName.isEmpty()) {
         CleanData(false);
         return false;
     }
     name_ = templateName;
-    xml_ = file->scanText();
+    xml_ = kareport::ScanText(*text);
     if (!ReadXmlData()) {
         CleanData(false);
         return false;

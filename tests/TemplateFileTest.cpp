@@ -7,7 +7,9 @@
 
 #include <gtest/gtest.h>
 
+#include <random>
 #include <string_view>
+#include <vector>
 
 using kareport::ScanText;
 using kareport::TemplateFile;
@@ -191,6 +193,53 @@ TEST(TemplateFile, CannotReadWhatIsNoFile)
     const QTemporaryDir folder;
     EXPECT_FALSE(TemplateFile::read(folder.filePath(QStringLiteral("missing.xml"))));
     EXPECT_FALSE(TemplateFile::read(folder.path())) << "a folder";
+}
+
+TEST(TemplateFile, IsReadForScanningAsItsTextIsScanned)
+{
+    // Bytes of every kind beside each other: what is stripped, what stands just beside it, zeros, pieces of characters.
+    const std::vector<QByteArray> pieces = {"\t",
+                                            "\n",
+                                            "\r",
+                                            "\r\n\t\t",
+                                            "\x08",
+                                            "\x0B",
+                                            "\x0C",
+                                            "\x0E",
+                                            "<Name>",
+                                            "</>",
+                                            "ABCDEFGHIJKLMNOPQRSTUVWXYZ",
+                                            " ",
+                                            "\xC3\xA4",
+                                            "\xE6\xBC\xA2",
+                                            "\xF0\x9F\x98\x80",
+                                            QByteArray(1, '\0'),
+                                            "\xE4",
+                                            "\x80"};
+    const QTemporaryDir folder;
+    const QString path = folder.filePath(QStringLiteral("t.xml"));
+    std::mt19937 random(20240305);
+    for (int round = 0; round < 2000; ++round) {
+        // Half of the files are UTF-8, and a zero is rare: it takes the rest of its chunk.
+        const std::size_t kinds = round % 2 == 0 ? pieces.size() - 2 : pieces.size();
+        QByteArray bytes;
+        for (auto length = random() % 400; length > 0; --length) {
+            const QByteArray &piece = pieces[random() % kinds];
+            bytes += piece.startsWith('\0') && random() % 50 != 0 ? QByteArray("x") : piece;
+        }
+        if (round % 10 == 0) {
+            bytes = bytes.repeated(40); // several chunks
+        }
+        QFile file(path);
+        ASSERT_TRUE(file.open(QIODevice::WriteOnly));
+        file.write(bytes);
+        file.close();
+        const auto scanned = TemplateFile::readScanned(path);
+        ASSERT_TRUE(scanned);
+        ASSERT_EQ(*scanned, TemplateFile(bytes).scanText().text()) << bytes.toHex(' ').constData();
+    }
+    EXPECT_FALSE(TemplateFile::readScanned(folder.filePath(QStringLiteral("missing.xml"))));
+    EXPECT_FALSE(TemplateFile::readScanned(folder.path())) << "a folder";
 }
 
 } // namespace
