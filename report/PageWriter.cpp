@@ -8,8 +8,10 @@ namespace
 
 int countLineFeeds(QStringView text)
 {
-    // Most pieces hold none, which is found faster than a number.
-    return text.contains(u'\n') ? static_cast<int>(text.count(u'\n')) : 0;
+    // Most pieces hold none, or one at their end: that there is none before it is found faster than a number.
+    const int atEnd = text.endsWith(u'\n') ? 1 : 0;
+    const QStringView before = text.chopped(atEnd);
+    return atEnd + (before.contains(u'\n') ? static_cast<int>(before.count(u'\n')) : 0);
 }
 
 } // namespace

@@ -1,5 +1,7 @@
 #include "ReportText.h"
 
+#include "LargePages.h"
+
 #include <QString>
 
 #include <algorithm>
@@ -53,11 +55,8 @@ bool ReportText::replaceNow(qint64 at, qint64 removed, QStringView inserted) con
                      : wide_.replace(at, removed, inserted.utf16(), inserted.size());
 }
 
-void ReportText::settle() const
+void ReportText::carryOutPending() const
 {
-    if (pending_.isEmpty()) {
-        return;
-    }
     // In the order of their places, so that the text is moved once for all of them.
     qint64 shift = 0;
     for (const PendingEdits::Edit &edit : pending_.edits()) {
@@ -86,6 +85,15 @@ bool ReportText::widen() const
 bool ReportText::owns(QStringView text) const
 {
     return !isNarrow_ && wide_.holds(text.utf16());
+}
+
+void ReportText::expect(qint64 characters)
+{
+    settle();
+    const qint64 all = size() + characters;
+    if (void *memory = isNarrow_ ? narrow_.expect(all) : wide_.expect(all)) {
+        preferLargePages(memory, static_cast<std::size_t>(all) * (isNarrow_ ? 1 : sizeof(char16_t)));
+    }
 }
 
 bool ReportText::append(QStringView text)

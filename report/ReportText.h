@@ -47,6 +47,9 @@ public:
     /// are more than `longest`; the text stays as it is
     bool reserve(qint64 characters) { return isNarrow_ ? narrow_.reserve(characters) : wide_.reserve(characters); }
 
+    /// Prepares for so many characters, which are about to be appended. Without effect where there is no memory for them.
+    void expect(qint64 characters);
+
     /// Appends a text. @return false, changing nothing, when there is no room
     bool append(QStringView text);
     /// Appends a line end, CR LF. @return false, changing nothing, when there is no room
@@ -67,7 +70,13 @@ private:
     static constexpr qint64 longestPending = 2 * blockSize; ///< characters inserted by one of them
 
     bool widen() const;
-    void settle() const;
+    void settle() const
+    {
+        if (!pending_.isEmpty()) {
+            carryOutPending();
+        }
+    }
+    void carryOutPending() const;
     bool replaceNow(qint64 at, qint64 removed, QStringView inserted) const;
 
     // How the text is kept is nothing that a reader sees, so it changes in a const text as well.

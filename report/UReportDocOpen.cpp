@@ -82,6 +82,7 @@ int UReportDoc::LoadFile(const QString &path, bool keepLineEnds)
     if (!file.open(QIODevice::ReadOnly)) {
         return 0;
     }
+    page_.text().expect(file.size() + file.size() / 8);
     kareport::ReportFileReader reader(file);
     bool isRichText = false;
     bool isFirst = true;

@@ -56,17 +56,30 @@ std::vector<OutputElement> readOutputs(const ScanText &list, QStringView tag, Fi
 
 } // namespace
 
+TemplateSequence::TemplateSequence(const ScanText &file, ScanNotes *notes)
+    : elements_(file, u"REPORTTEMPLATE", notes), notes_(notes)
+{}
+
+std::optional<TemplateElement> TemplateSequence::next()
+{
+    auto element = elements_.next();
+    if (!element) {
+        return std::nullopt;
+    }
+    ScanText rest = element->value;
+    TemplateElement found;
+    found.body = std::move(*element);
+    found.name = ExtractNode(rest, u"NAME", true, notes_);
+    found.title = GetNode(rest, u"TITLE", notes_);
+    return found;
+}
+
 std::vector<TemplateElement> readTemplateElements(const ScanText &file, ScanNotes *notes)
 {
     std::vector<TemplateElement> templates;
-    NodeSequence sequence(file, u"REPORTTEMPLATE", notes);
+    TemplateSequence sequence(file, notes);
     while (auto element = sequence.next()) {
-        ScanText rest = element->value;
-        TemplateElement found;
-        found.body = std::move(*element);
-        found.name = ExtractNode(rest, u"NAME", true, notes);
-        found.title = GetNode(rest, u"TITLE", notes);
-        templates.push_back(std::move(found));
+        templates.push_back(std::move(*element));
     }
     return templates;
 }

@@ -2,6 +2,7 @@
 
 #include "TagScanner.h"
 
+#include <optional>
 #include <vector>
 
 namespace kareport
@@ -60,6 +61,21 @@ struct TemplateElement
     ScanElement body; ///< with its name and title
     ScanElement name;
     ScanElement title;
+};
+
+/// The templates of a whole file, one after the other in file order, for whoever needs only some of them.
+class TemplateSequence
+{
+public:
+    /// The text must live as long as the sequence.
+    explicit TemplateSequence(const ScanText &file, ScanNotes *notes = nullptr);
+
+    /// The next template; nothing behind the last one.
+    std::optional<TemplateElement> next();
+
+private:
+    NodeSequence elements_;
+    ScanNotes *notes_;
 };
 
 /// The templates of a whole file, in file order.

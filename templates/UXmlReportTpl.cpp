@@ -7,6 +7,7 @@
 #include "VariableType.h"
 
 #include <algorithm>
+#include <optional>
 
 using kareport::equalFolded;
 using kareport::foldedKey;
@@ -74,18 +75,18 @@ bool UXmlReportTpl::ReadXmlData()
 
 bool UXmlReportTpl::ReadTemplatesAvailable()
 {
-    const kareport::ScanText *chosen = nullptr;
-    const auto elements = kareport::readTemplateElements(xml_);
-    for (const auto &element : elements) {
-        templates_.push_back({element.name.value.text(), element.title.value.text()});
-        if (equalFolded(element.name.value.view(), name_)) {
-            chosen = &element.body.value;
+    std::optional<kareport::ScanText> chosen; // the last one of the name
+    kareport::TemplateSequence sequence(xml_);
+    while (auto element = sequence.next()) {
+        templates_.push_back({element->name.value.text(), element->title.value.text()});
+        if (equalFolded(element->name.value.view(), name_)) {
+            chosen = std::move(element->body.value);
         }
     }
-    if (chosen == nullptr) {
+    if (!chosen) {
         return false;
     }
-    xml_ = *chosen;
+    xml_ = *std::move(chosen);
     return true;
 }
 

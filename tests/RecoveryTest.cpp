@@ -142,6 +142,24 @@ TEST(Recovery, FormatsOfAnEditedRichTextComeBack)
     EXPECT_EQ(cursor.charFormat().fontWeight(), QFont::Bold);
 }
 
+TEST(Recovery, AReportHasTheNameThatTheUserKnows)
+{
+    struct Row
+    {
+        kareport::KeptReport kept;
+        const char *name;
+        const char *reason;
+    };
+    const Row rows[] = {
+        {{QStringLiteral("Stakeout"), QStringLiteral("/road/a.rep"), QString()}, "Stakeout", "its title"},
+        {{QString(), QStringLiteral("/road/a.rep"), QString()}, "/road/a.rep", "opened from a file"},
+        {{QString(), QString(), QStringLiteral("1.txt")}, "Untitled", "neither"},
+    };
+    for (const Row &row : rows) {
+        EXPECT_EQ(row.kept.name(), QString::fromUtf8(row.name)) << row.reason;
+    }
+}
+
 TEST(Recovery, OnlyTheUserCanReadWhatIsKept)
 {
     const CrashFolder folder;

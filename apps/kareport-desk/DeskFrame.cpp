@@ -230,7 +230,8 @@ void DeskFrame::OfferLeftReports()
     const std::vector<kareport::KeptReport> left = recovery_.leftReports();
     QStringList names;
     for (const kareport::KeptReport &kept : left) {
-        names.append(kept.title + (kept.textFile.isEmpty() ? QString() : Xlate(" (with changes that were not saved)")));
+        names.append(kept.name() +
+                     (kept.textFile.isEmpty() ? QString() : Xlate(" (with changes that were not saved)")));
     }
     if (!left.empty()) {
         const MessageAnswer answer = kareport::showMessage(
@@ -246,7 +247,7 @@ void DeskFrame::OfferLeftReports()
                 if (UReportDoc *report = kareport::Recovery::reopen(kept)) {
                     activate(report);
                 } else {
-                    lost.append(kept.title.isEmpty() ? kept.path : kept.title);
+                    lost.append(kept.name());
                 }
             }
         }

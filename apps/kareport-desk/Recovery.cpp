@@ -6,6 +6,7 @@
 #include "UReportDoc.h"
 #include "UReportView.h"
 #include "UReportWindowDlg.h"
+#include "Xlate.h"
 
 #include <QDir>
 #include <QFile>
@@ -64,6 +65,14 @@ std::vector<KeptReport> readList(const QString &folder)
 QString Recovery::usualFolder()
 {
     return QStandardPaths::writableLocation(QStandardPaths::AppLocalDataLocation) + QStringLiteral("/recovery");
+}
+
+QString KeptReport::name() const
+{
+    if (!title.isEmpty()) {
+        return title;
+    }
+    return path.isEmpty() ? Xlate("Untitled") : path;
 }
 
 Recovery::Recovery(const QString &folder)

@@ -18,6 +18,9 @@ struct KeptReport
     QString title;
     QString path;     ///< of its file; empty for a report that has none
     QString textFile; ///< holds what was not saved; empty when the report's own file holds all
+
+    /// What the user knows it by: a report that was opened from a file has no title.
+    QString name() const;
 };
 
 /// Keeps what is open on the disk, so that it comes back after a crash.

@@ -31,6 +31,16 @@ def table(comparison):
     return "\n".join(rows)
 
 
+def parts_table(rows):
+    lines = ["| part | median | at most | cost at ten times as many, 1 is the same an item |", "|---|---|---|---|"]
+    for row in rows:
+        most = readable(row["most"]) if row["most"] else ""
+        mark = " **not kept**" if row["most"] and row["seconds"] > row["most"] else ""
+        growth = f"{row['growth']:.2f}" if row["growth"] else ""
+        lines.append(f"| {row['what']} | {readable(row['seconds'])}{mark} | {most} | {growth} |")
+    return "\n".join(lines)
+
+
 def limits(comparison):
     rows = []
     for limit in comparison.limits:
@@ -69,12 +79,14 @@ def draw(comparisons):
 
 def write(comparisons, measured):
     """@param measured  the days on which the comparisons were made"""
+    parts = "\n".join(parts_table(comparison.parts) for comparison in comparisons if comparison.parts)
+    comparisons = [comparison for comparison in comparisons if not comparison.parts]
     pictures = draw(comparisons)
     sections = "\n".join(section(comparison, picture) for comparison, picture in zip(comparisons, pictures))
     with open(os.path.join(HERE, "performance.in.md"), encoding="utf-8") as file:
         text = file.read()
     for mark, content in (("@machine@", machine()), ("@measured@", measured), ("@summary@", summary(comparisons)),
-                          ("@comparisons@", sections)):
+                          ("@comparisons@", sections), ("@parts@", parts)):
         text = text.replace(mark, content)
     with open(os.path.join(DOCS, "performance.md"), "w", encoding="utf-8") as file:
         file.write(text)

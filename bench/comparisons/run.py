@@ -12,7 +12,7 @@ from measure import Result
 from work import Comparison, Limit, Surroundings
 
 HERE = os.path.dirname(os.path.abspath(__file__))
-WORKS = ["rows", "pages", "report_file", "viewer", "rich_text", "templates", "batch"]
+WORKS = ["rows", "pages", "report_file", "viewer", "rich_text", "templates", "batch", "parts"]
 
 
 def kept_path(folder, work):
@@ -56,7 +56,9 @@ def main():
         print(work, file=sys.stderr, flush=True)
         comparisons = importlib.import_module(work).run(surroundings)
         for comparison in comparisons:
-            print(f"\n{comparison.title}\n{page.table(comparison)}\n{page.limits(comparison)}\n", flush=True)
+            shown = page.parts_table(comparison.parts) if comparison.parts else \
+                f"{page.table(comparison)}\n{page.limits(comparison)}"
+            print(f"\n{comparison.title}\n{shown}\n", flush=True)
         if not options.quick:
             keep(kept, work, comparisons)
     if options.quick:

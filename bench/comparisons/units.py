@@ -1,5 +1,5 @@
 """Seconds as a person reads them."""
-UNITS = [(60, "min", 1 / 60), (1, "s", 1), (0.001, "ms", 1000), (0, "µs", 1e6)]
+UNITS = [(60, "min", 1 / 60), (1, "s", 1), (0.001, "ms", 1000), (1e-6, "µs", 1e6), (0, "ns", 1e9)]
 
 
 def readable(seconds):

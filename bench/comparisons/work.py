@@ -28,6 +28,7 @@ class Comparison:
     limits: list
     axis: str = "seconds"
     extra: list = dataclasses.field(default_factory=list)  # lines below the table
+    parts: list = dataclasses.field(default_factory=list)  # rows of micro benchmarks instead of all of this
 
 
 class Surroundings:
