@@ -3,6 +3,7 @@
 //   ka_file_work save TEXT OUT    TEXT (UTF-16LE) is put into a report; the time of saving it as OUT
 //   ka_file_work load IN          the time of loading a report file
 //   ka_file_work copy IN OUT      the time of writing the bytes of IN as OUT: what any saving must take
+//   ka_file_work deflate IN       the time of compressing the pages of a report file as a PDF does, 72 lines a page
 //   ka_file_work pdf IN OUT       IN is loaded; the time of writing it as a PDF, 72 lines a page
 //
 // Prints the seconds and the peak memory of the process in KB.
@@ -29,6 +30,25 @@ int say(const std::function<bool()> &work)
     const double seconds = double(timer.nsecsElapsed()) * 1e-9;
     std::printf("%.6f %ld\n", seconds, peakMemory());
     return done ? 0 : 1;
+}
+
+/// What stands in a page of a PDF: two bytes for each character, and the commands around a line.
+QByteArrayList pageContents(const QByteArray &report)
+{
+    constexpr qsizetype linesOfPage = 72;
+    QByteArrayList pages;
+    qsizetype lines = 0;
+    for (const QByteArray &line : report.split('\n')) {
+        if (lines++ % linesOfPage == 0) {
+            pages.append("BT\n/F1 8 Tf\n");
+        }
+        pages.last() += '(';
+        for (const char character : line.trimmed()) {
+            (pages.last() += '\0') += character;
+        }
+        pages.last() += ") '\n";
+    }
+    return pages;
 }
 
 QByteArray contentOf(const char *path)
@@ -59,6 +79,16 @@ int main(int argc, char **argv)
                                          [&](QIODevice &device) { return device.write(bytes) == bytes.size(); });
         });
     }
+    if (verb == QByteArrayView("deflate") && argc == 3) {
+        const QByteArrayList pages = pageContents(contentOf(argv[2]));
+        return say([&] {
+            qsizetype size = 0;
+            for (const QByteArray &page : pages) {
+                size += qCompress(page).size();
+            }
+            return size > 0;
+        });
+    }
     if (verb == QByteArrayView("pdf") && argc == 4) {
         report.FixPage(72, 80);
         report.SetPageSize();
@@ -74,6 +104,6 @@ int main(int argc, char **argv)
                                          [&](QIODevice &device) { return report.WritePdf(device); });
         });
     }
-    std::fputs("ka_file_work save TEXT OUT | load IN | copy IN OUT | pdf IN OUT\n", stderr);
+    std::fputs("ka_file_work save TEXT OUT | load IN | copy IN OUT | deflate IN | pdf IN OUT\n", stderr);
     return 1;
 }

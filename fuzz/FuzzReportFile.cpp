@@ -27,7 +27,7 @@ void checkPieces(const QByteArray &bytes)
     kareport::ReportFileReader reader(file);
     QString all;
     while (reader.next()) {
-        const QStringView piece = reader.piece();
+        const QLatin1StringView piece = reader.piece();
         expect(!piece.isEmpty() && piece.size() <= kareport::ReportFileReader::longestPiece);
         expect(piece.indexOf(u'\n') < 0 || piece.indexOf(u'\n') == piece.size() - 1);
         all += piece;

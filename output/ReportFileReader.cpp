@@ -35,9 +35,10 @@ bool ReportFileReader::next()
     const qsizetype available = std::min(bytes_.size() - at_, longestPiece + 1);
     if (available == 0) {
         size_ = 0;
+        taken_ = 0;
         return false;
     }
-    const char *const line = bytes_.constData() + at_;
+    char *const line = bytes_.data() + at_;
     const void *const feed = std::memchr(line, '\n', static_cast<std::size_t>(available));
     qsizetype content = feed != nullptr ? static_cast<const char *>(feed) - line : available;
     qsizetype taken = content;
@@ -52,12 +53,11 @@ bool ReportFileReader::next()
         // A CR whose LF may stand behind what was looked at belongs to the next piece.
         content = taken = std::min(content, longestPiece);
     }
-    std::transform(line, line + content, characters_.begin(),
-                   [](char byte) { return static_cast<char16_t>(static_cast<unsigned char>(byte)); });
     size_ = content;
     if (ends) {
-        characters_[static_cast<std::size_t>(size_++)] = u'\n';
+        line[size_++] = '\n'; // where it stood, or in place of the CR before it
     }
+    taken_ = taken;
     at_ += taken;
     return true;
 }

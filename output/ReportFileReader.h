@@ -3,9 +3,7 @@
 #include "KaReportExport.h"
 
 #include <QByteArray>
-#include <QStringView>
-
-#include <array>
+#include <QLatin1StringView>
 
 class QIODevice;
 
@@ -25,7 +23,7 @@ public:
     /// Reads a line with its LF, or the next piece of a long one. @return false at the end of the file
     bool next();
     /// What was read, until the next call.
-    QStringView piece() const { return QStringView(characters_.data(), size_); }
+    QLatin1StringView piece() const { return {bytes_.constData() + at_ - taken_, size_}; }
 
 private:
     void fill();
@@ -34,7 +32,7 @@ private:
     QByteArray bytes_;
     qsizetype at_ = 0;
     bool atEnd_ = false;
-    std::array<char16_t, longestPiece> characters_{};
+    qsizetype taken_ = 0; ///< bytes of the file that the piece was made of, which stand before `at_`
     qsizetype size_ = 0;
 };
 

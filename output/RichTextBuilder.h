@@ -14,31 +14,72 @@ class QTextDocument;
 namespace kareport
 {
 
-/// Fills a document paragraph by paragraph; all is there when the builder goes. Texts and paragraphs of the same formats are inserted together, as each
-/// insertion has its cost.
-class RichTextBuilder
+/// Takes what is read of a rich text, paragraph by paragraph.
+class RichTextTarget
+{
+public:
+    virtual ~RichTextTarget() = default;
+
+    /// Whether it wants to know the formats. Otherwise any number does for one.
+    virtual bool takesFormats() const = 0;
+    /// Adds text to the paragraph; it holds no characters that part paragraphs.
+    virtual void append(QLatin1StringView text, int format) = 0;
+    virtual void append(char16_t character, int format) = 0;
+    virtual bool isParagraphEmpty() const = 0;
+    /// Ends the paragraph.
+    /// @param format  of the paragraph's characters where it has none
+    virtual void endParagraph(const RichTextParagraph &paragraph, int format) = 0;
+};
+
+/// Collects the characters alone, paragraphs parted by U+2029.
+class RichTextCollector final : public RichTextTarget
+{
+public:
+    explicit RichTextCollector(QString &text) : text_(text) { text_.clear(); }
+
+    bool takesFormats() const override { return false; }
+    void append(QLatin1StringView text, int /*format*/) override { paragraph_.append(text); }
+    void append(char16_t character, int /*format*/) override { paragraph_.append(QChar(character)); }
+    bool isParagraphEmpty() const override { return paragraph_.isEmpty(); }
+    void endParagraph(const RichTextParagraph & /*paragraph*/, int /*format*/) override
+    {
+        if (!isFirst_) {
+            text_.append(QChar(QChar::ParagraphSeparator));
+        }
+        isFirst_ = false;
+        text_.append(paragraph_);
+        paragraph_.resize(0); // not clear(), which would give the room back
+    }
+
+private:
+    QString &text_;
+    QString paragraph_;
+    bool isFirst_ = true;
+};
+
+/// Fills a document; all is there when the builder goes. Texts and paragraphs of the same formats are inserted together, as
+/// each insertion has its cost.
+class RichTextBuilder final : public RichTextTarget
 {
 public:
     RichTextBuilder(QTextDocument &document, RichTextFormats &formats);
-    ~RichTextBuilder();
+    ~RichTextBuilder() override;
     RichTextBuilder(const RichTextBuilder &) = delete;
     RichTextBuilder &operator=(const RichTextBuilder &) = delete;
 
-    /// Adds text to the paragraph; it holds no characters that part paragraphs.
-    void append(QLatin1StringView text, int format)
+    bool takesFormats() const override { return true; }
+    void append(QLatin1StringView text, int format) override
     {
         paragraph_.append(text);
         setFormat(format);
     }
-    void append(char16_t character, int format)
+    void append(char16_t character, int format) override
     {
         paragraph_.append(QChar(character));
         setFormat(format);
     }
-    bool isParagraphEmpty() const { return paragraph_.isEmpty(); }
-    /// Ends the paragraph.
-    /// @param format  of the paragraph's characters where it has none
-    void endParagraph(const RichTextParagraph &paragraph, int format);
+    bool isParagraphEmpty() const override { return paragraph_.isEmpty(); }
+    void endParagraph(const RichTextParagraph &paragraph, int format) override;
 
 private:
     struct Run

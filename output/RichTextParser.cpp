@@ -27,7 +27,16 @@ bool isEscapedText(const RichTextToken &token)
 } // namespace
 
 RichTextParser::RichTextParser(QByteArrayView bytes, RichTextRawBytes rawBytes, QTextDocument &document)
-    : tokens_(bytes), rawBytes_(rawBytes), formats_(fonts_), builder_(document, formats_)
+    : tokens_(bytes),
+      rawBytes_(rawBytes),
+      formats_(fonts_),
+      target_(std::make_unique<RichTextBuilder>(document, formats_))
+{
+    state_.codePage = &codePages_.page(fileCodePage_);
+}
+
+RichTextParser::RichTextParser(QByteArrayView bytes, RichTextRawBytes rawBytes, QString &text)
+    : tokens_(bytes), rawBytes_(rawBytes), formats_(fonts_), target_(std::make_unique<RichTextCollector>(text))
 {
     state_.codePage = &codePages_.page(fileCodePage_);
 }
@@ -69,7 +78,7 @@ QString RichTextParser::read()
         }
     }
     flushBytes();
-    if (!builder_.isParagraphEmpty()) {
+    if (!target_->isParagraphEmpty()) {
         endParagraph();
     }
     return error;

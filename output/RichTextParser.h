@@ -12,6 +12,7 @@
 #include <QByteArray>
 
 #include <cstddef>
+#include <memory>
 #include <string_view>
 #include <vector>
 
@@ -27,11 +28,13 @@ enum class RichTextRawBytes
     Utf8
 };
 
-/// Reads a rich text into a document.
+/// Reads a rich text into a document, or its characters alone.
 class RichTextParser
 {
 public:
     RichTextParser(QByteArrayView bytes, RichTextRawBytes rawBytes, QTextDocument &document);
+    /// Reads the characters alone.
+    RichTextParser(QByteArrayView bytes, RichTextRawBytes rawBytes, QString &text);
 
     /// Reads to the end of the outermost group. @return what was expected where it could not; empty where all was read
     QString read();
@@ -104,7 +107,7 @@ private:
     bool nestedRowEnded_ = false;
     bool pageBreak_ = false; ///< before the next paragraph
     bool sectionBreak_ = false;
-    RichTextBuilder builder_;
+    std::unique_ptr<RichTextTarget> target_;
 };
 
 } // namespace kareport

@@ -63,7 +63,7 @@ void RichTextParser::putAscii(std::string_view bytes)
         fonts_.current().family.append(text);
     } else if (isShown()) {
         beforeText();
-        builder_.append(text, format());
+        target_->append(text, format());
     }
 }
 
@@ -101,7 +101,7 @@ void RichTextParser::put(char16_t character)
         fonts_.current().family.append(QChar(character));
     } else if (isShown()) {
         beforeText();
-        builder_.append(character, format());
+        target_->append(character, format());
     }
 }
 
@@ -110,14 +110,14 @@ void RichTextParser::beforeText()
     nestedRowEnded_ = false;
     if (cellEnded_) {
         cellEnded_ = false;
-        builder_.append(u'\t', format());
+        target_->append(u'\t', format());
     }
 }
 
 int RichTextParser::format()
 {
     if (state_.format < 0) {
-        state_.format = formats_.character(state_.characters);
+        state_.format = target_->takesFormats() ? formats_.character(state_.characters) : 0;
     }
     return state_.format;
 }
@@ -131,9 +131,9 @@ void RichTextParser::endParagraph()
     if (pageBreak_) {
         RichTextParagraph paragraph = state_.paragraph;
         paragraph.pageBreakBefore = true;
-        builder_.endParagraph(paragraph, format());
+        target_->endParagraph(paragraph, format());
     } else {
-        builder_.endParagraph(state_.paragraph, format());
+        target_->endParagraph(state_.paragraph, format());
     }
     pageBreak_ = false;
     sectionBreak_ = false;
@@ -147,7 +147,7 @@ void RichTextParser::endRow(bool isNested)
     }
     cellEnded_ = false;
     // A table that fills the last cell of a row has ended the row's paragraph already.
-    if (isNested || !nestedRowEnded_ || !builder_.isParagraphEmpty()) {
+    if (isNested || !nestedRowEnded_ || !target_->isParagraphEmpty()) {
         endParagraph();
     }
     nestedRowEnded_ = isNested;
@@ -158,7 +158,7 @@ void RichTextParser::breakPage()
     if (!isShown()) {
         return;
     }
-    if (!builder_.isParagraphEmpty()) {
+    if (!target_->isParagraphEmpty()) {
         endParagraph();
     }
     pageBreak_ = true;

@@ -26,18 +26,20 @@ TextPlace placeOf(QByteArrayView bytes, qsizetype position, RichTextRawBytes raw
     return {before.count('\n') + 1, line.size() - continues + 1};
 }
 
-std::optional<RichTextError> readBytes(QByteArrayView bytes, RichTextRawBytes rawBytes, QTextDocument &document,
+/// @param target  a document, or a text
+template <typename Target>
+std::optional<RichTextError> readBytes(QByteArrayView bytes, RichTextRawBytes rawBytes, Target &target,
                                        RichTextNotes *notes)
 {
     if (notes != nullptr) {
         *notes = {};
     }
     if (!isRichText(bytes)) {
-        document.clear();
+        target.clear();
         return RichTextError{{},
                              Xlate("%1 was expected, with which a rich text begins").arg(QLatin1StringView(beginning))};
     }
-    RichTextParser parser(bytes, rawBytes, document);
+    RichTextParser parser(bytes, rawBytes, target);
     const QString error = parser.read();
     if (notes != nullptr) {
         *notes = parser.notes();
@@ -78,6 +80,11 @@ bool isRichText(QStringView text)
 std::optional<RichTextError> readRichText(QByteArrayView bytes, QTextDocument &document, RichTextNotes *notes)
 {
     return readBytes(bytes, RichTextRawBytes::CodePage, document, notes);
+}
+
+std::optional<RichTextError> readRichTextCharacters(QByteArrayView bytes, QString &text, RichTextNotes *notes)
+{
+    return readBytes(bytes, RichTextRawBytes::CodePage, text, notes);
 }
 
 std::optional<RichTextError> readRichText(QStringView text, QTextDocument &document, RichTextNotes *notes)

@@ -46,13 +46,6 @@ public:
 
     /// Makes room for so many characters and the 0 behind them.
     bool reserve(qint64 characters) { return characters <= usable_ || grow(characters); }
-    /// Gets the memory for so many characters ahead and does not touch it: what comes will not have to move. @return the
-    /// memory, or null when it is there already, or there is none
-    void *expect(qint64 characters)
-    {
-        const bool isGot = characters <= longest && characters > allocated_ && allocate(characters);
-        return isGot ? data_ : nullptr;
-    }
     /// Takes characters over that were written behind the last one, within what was reserved.
     void setSize(qint64 size)
     {

@@ -1,17 +1,33 @@
 #include "PageWriter.h"
 
+#include <QByteArrayView>
+
+#include <type_traits>
+
 namespace kareport
 {
 
 namespace
 {
 
-int countLineFeeds(QStringView text)
+// Most pieces hold none, which is found faster than a number.
+qsizetype countAll(QStringView text)
 {
-    // Most pieces hold none, or one at their end: that there is none before it is found faster than a number.
+    return text.contains(u'\n') ? text.count(u'\n') : 0;
+}
+
+qsizetype countAll(QLatin1StringView text)
+{
+    const QByteArrayView bytes(text);
+    return bytes.contains('\n') ? bytes.count('\n') : 0;
+}
+
+template <typename View>
+int countLineFeeds(View text)
+{
+    // One at the end need not be looked for.
     const int atEnd = text.endsWith(u'\n') ? 1 : 0;
-    const QStringView before = text.chopped(atEnd);
-    return atEnd + (before.contains(u'\n') ? static_cast<int>(before.count(u'\n')) : 0);
+    return atEnd + static_cast<int>(countAll(text.chopped(atEnd)));
 }
 
 } // namespace
@@ -38,10 +54,11 @@ bool PageWriter::emptyIntoOutlet()
     return isTaken;
 }
 
-bool PageWriter::write(QStringView text, int style)
+template <typename View>
+bool PageWriter::writeText(View text, int style)
 {
     if (text_.owns(text)) {
-        return write(text.toString(), style);
+        return writeText(QStringView(text.toString()), style);
     }
     if (!text_.append(text)) {
         hasLostText_ = true;
@@ -51,10 +68,26 @@ bool PageWriter::write(QStringView text, int style)
     lineNumber_ += lineFeeds;
     lineCount_ += lineFeeds;
     if (observer_ != nullptr && !text.isEmpty()) {
-        observer_->textWritten(text, style);
+        if (!observer_->takesText()) {
+            observer_->changed();
+        } else if constexpr (std::is_same_v<View, QStringView>) {
+            observer_->textWritten(text, style);
+        } else {
+            observer_->textWritten(QString(text), style);
+        }
     }
     noteGrowth();
     return true;
+}
+
+bool PageWriter::write(QStringView text, int style)
+{
+    return writeText(text, style);
+}
+
+bool PageWriter::write(QLatin1StringView text, int style)
+{
+    return writeText(text, style);
 }
 
 void PageWriter::lineFeed(qint64 count)
@@ -113,15 +146,26 @@ void PageWriter::skipLines(qint64 count)
     }
 }
 
-void PageWriter::writeLine(QStringView text, int linesBefore, int linesAfter, int style)
+template <typename View>
+void PageWriter::writeTextLine(View text, int linesBefore, int linesAfter, int style)
 {
     skipLines(linesBefore);
-    write(text, style);
+    writeText(text, style);
     if (linesAfter != 0) {
         lineFeed(1);
         skipLines(qint64(linesAfter) - 1);
     }
     noteChange();
+}
+
+void PageWriter::writeLine(QStringView text, int linesBefore, int linesAfter, int style)
+{
+    writeTextLine(text, linesBefore, linesAfter, style);
+}
+
+void PageWriter::writeLine(QLatin1StringView text, int linesBefore, int linesAfter, int style)
+{
+    writeTextLine(text, linesBefore, linesAfter, style);
 }
 
 void PageWriter::writeHeading()

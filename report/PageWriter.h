@@ -7,6 +7,9 @@
 #include <QString>
 #include <QStringView>
 
+#include <algorithm>
+#include <limits>
+
 namespace kareport
 {
 
@@ -15,6 +18,8 @@ class KAREPORT_EXPORT PageWriterObserver
 {
 public:
     virtual ~PageWriterObserver();
+    /// Whether it wants the text of what is written. Otherwise it need only be told that something was.
+    virtual bool takesText() const { return true; }
     /// A piece of text, never empty, with the style it was written in.
     virtual void textWritten(QStringView text, int style) = 0;
     /// A line end that is no part of a piece.
@@ -52,7 +57,10 @@ public:
     void noteLostText() { hasLostText_ = true; }
 
     int lineNumber() const { return lineNumber_; } ///< line on the page; 1 right after a page break
-    int lineCount() const { return lineCount_; }   ///< lines since the last `clear`; 0: nothing has been written
+    int lineCount() const
+    {
+        return static_cast<int>(std::min<qint64>(lineCount_, std::numeric_limits<int>::max()));
+    }                                              ///< lines since the last `clear`; 0: nothing has been written
     int pageNumber() const { return pageNumber_; } ///< from 1
 
     int linesPerPage() const { return linesPerPage_; }
@@ -68,6 +76,7 @@ public:
     void clear();
     /// Appends text as it is, counting its line feeds. @return false, changing nothing, when there is no room
     bool write(QStringView text, int style);
+    bool write(QLatin1StringView text, int style);
     /// Ends the line so many times; stops where there is no room.
     void lineFeed(qint64 count);
     /// Starts a new page when so many lines and one more do not fit, always for a number below 0.
@@ -78,6 +87,7 @@ public:
     /// Writes a line: blank lines before it (dropped at a page's start), the text, line ends after it. With 0 after, the
     /// line stays open.
     void writeLine(QStringView text, int linesBefore, int linesAfter, int style);
+    void writeLine(QLatin1StringView text, int linesBefore, int linesAfter, int style);
     /// Ends the page without looking at what is left of it, and begins the next one.
     void breakPage();
     /// What `newPage` does before anything is written.
@@ -94,6 +104,11 @@ private:
     static constexpr int headerGap = 4;                    ///< line ends behind the header line
     static constexpr qint64 mostBeforeOutlet = 256 * 1024; ///< characters: few enough to be near the processor
 
+    template <typename View>
+    bool writeText(View text, int style);
+    template <typename View>
+    void writeTextLine(View text, int linesBefore, int linesAfter, int style);
+
     void noteGrowth()
     {
         if (outlet_ != nullptr && text_.size() >= mostBeforeOutlet) {
@@ -106,7 +121,7 @@ private:
     ReportTextWriter *outlet_ = nullptr;
     bool hasLostText_ = false;
     int lineNumber_ = 0;
-    int lineCount_ = 0;
+    qint64 lineCount_ = 0; ///< a report that is handed on may have any number
     int pageNumber_ = 0;
     int linesPerPage_ = 72;
     bool headerFlag_ = false;

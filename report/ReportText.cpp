@@ -1,7 +1,5 @@
 #include "ReportText.h"
 
-#include "LargePages.h"
-
 #include <QString>
 
 #include <algorithm>
@@ -87,13 +85,32 @@ bool ReportText::owns(QStringView text) const
     return !isNarrow_ && wide_.holds(text.utf16());
 }
 
-void ReportText::expect(qint64 characters)
+bool ReportText::owns(QLatin1StringView text) const
+{
+    return isNarrow_ && narrow_.holds(reinterpret_cast<const unsigned char *>(text.data()));
+}
+
+bool ReportText::append(QLatin1StringView text)
 {
     settle();
-    const qint64 all = size() + characters;
-    if (void *memory = isNarrow_ ? narrow_.expect(all) : wide_.expect(all)) {
-        preferLargePages(memory, static_cast<std::size_t>(all) * (isNarrow_ ? 1 : sizeof(char16_t)));
+    if (size() + text.size() > longest) {
+        return false;
     }
+    if (owns(text)) {
+        return append(QStringView(QString(text)));
+    }
+    if (!reserve(size() + text.size())) {
+        return false;
+    }
+    const auto *bytes = reinterpret_cast<const unsigned char *>(text.data());
+    if (isNarrow_) {
+        std::copy_n(bytes, text.size(), narrow_.data() + narrow_.size());
+        narrow_.setSize(narrow_.size() + text.size());
+    } else {
+        std::copy_n(bytes, text.size(), wide_.data() + wide_.size());
+        wide_.setSize(wide_.size() + text.size());
+    }
+    return true;
 }
 
 bool ReportText::append(QStringView text)

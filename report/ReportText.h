@@ -42,16 +42,15 @@ public:
 
     /// Whether a text is a piece of this very text, which a change may move.
     bool owns(QStringView text) const;
+    bool owns(QLatin1StringView text) const;
 
     /// Makes room for so many characters and the 0 behind them. @return false when there is no memory for them or they
     /// are more than `longest`; the text stays as it is
     bool reserve(qint64 characters) { return isNarrow_ ? narrow_.reserve(characters) : wide_.reserve(characters); }
 
-    /// Prepares for so many characters, which are about to be appended. Without effect where there is no memory for them.
-    void expect(qint64 characters);
-
     /// Appends a text. @return false, changing nothing, when there is no room
     bool append(QStringView text);
+    bool append(QLatin1StringView text);
     /// Appends a line end, CR LF. @return false, changing nothing, when there is no room
     bool appendLineEnd();
     /// Replaces the text. @return false when there is no room; the text is then empty

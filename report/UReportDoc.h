@@ -328,6 +328,7 @@ private:
         externalExcel = 2
     };
 
+    bool takesText() const override { return image_.isOn() || reportWindow_ != nullptr; }
     void textWritten(QStringView text, int style) override;
     void lineEnded() override;
     void changed() override;

@@ -119,8 +119,9 @@ void UReportDoc::openInEditor(const QString &editor)
     } else {
         startEditor(editor, file, *this);
     }
-    // While it is being loaded, whoever loads it still needs it.
-    if (IsReportAvailable(this) && closeDocument_ && !isSerializing_) {
+    // While it is being loaded, whoever loads it still needs it. What the editor did not get, for want of room on the disk or
+    // of memory, is nowhere else.
+    if (IsReportAvailable(this) && closeDocument_ && !isSerializing_ && (IsEmpty() || !IsModified())) {
         OnCloseDocument();
     }
 }

@@ -13,7 +13,7 @@ namespace
 {
 
 /// The word that the first line of a report begins with.
-constexpr QStringView firstWord = u"TALVEN";
+constexpr QLatin1StringView firstWord("TALVEN");
 
 /// The most of a file's first line that is looked at to tell what it is.
 constexpr qint64 longestProbe = 64 * 1024;
@@ -82,15 +82,14 @@ int UReportDoc::LoadFile(const QString &path, bool keepLineEnds)
     if (!file.open(QIODevice::ReadOnly)) {
         return 0;
     }
-    page_.text().expect(file.size() + file.size() / 8);
     kareport::ReportFileReader reader(file);
     bool isRichText = false;
     bool isFirst = true;
     bool isOpen = false;
     while (reader.next()) {
-        QStringView line = reader.piece();
+        QLatin1StringView line = reader.piece();
         if (std::exchange(isFirst, false)) {
-            isRichText = namesRichText(path) && kareport::isRichText(line.trimmed());
+            isRichText = namesRichText(path) && kareport::isRichText(QByteArrayView(line.trimmed()));
         }
         isOpen = isRichText && !line.endsWith(u'\n');
         if (isOpen) {

@@ -1,7 +1,6 @@
 #include "CommandLine.h"
 
-#include <QElapsedTimer>
-
+#include <algorithm>
 #include <csignal>
 #include <sys/resource.h>
 #include <sys/stat.h>
@@ -37,14 +36,16 @@ TEST(CommandLineStream, AFullDiskLeavesTheOldFileAndIsSaidAtOnce)
         const rlimit limit = {1 << 20, 1 << 20};
         setrlimit(RLIMIT_FSIZE, &limit);
     });
-    QElapsedTimer timer;
-    timer.start();
     process.start(QStringLiteral(KAREPORT_PROGRAM), words("render job.json --progress"), QIODevice::ReadOnly);
     ASSERT_TRUE(process.waitForFinished(60'000));
     const QByteArray err = process.readAllStandardError();
     EXPECT_EQ(process.exitCode(), 3) << err.constData();
     EXPECT_TRUE(err.contains("out.rep\" could not be written: ")) << err.constData();
-    EXPECT_FALSE(err.contains("100 %")) << "the rest of the rows was not read for nothing";
+    int furthest = 0;
+    for (const QByteArray &word : err.simplified().split(' ')) {
+        furthest = std::max(furthest, word.toInt());
+    }
+    EXPECT_LT(furthest, 50) << "the rest of the rows was not read for nothing";
     EXPECT_EQ(folder.bytesOf("out.rep"), "kept");
     EXPECT_EQ(folder.names(), words("job.json out.rep points.csv t.xml"));
 }
@@ -74,6 +75,7 @@ TEST(CommandLineStream, StoppedInTheMiddleTheOldFileStays)
         while (!err.contains('%') && process.waitForReadyRead(30'000)) {
             err += process.readAllStandardError();
         }
+        ASSERT_GT(process.processId(), 0) << err.constData();
         kill(static_cast<pid_t>(process.processId()), signal);
         ASSERT_TRUE(process.waitForFinished(60'000)) << signal;
         if (signal != SIGKILL) {

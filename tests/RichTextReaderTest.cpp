@@ -1,5 +1,12 @@
 #include "RichTextDescription.h"
 
+#include <QDir>
+#include <QFile>
+#include <QFileInfo>
+#include <QTextDocument>
+
+#include <random>
+
 using richtext::body;
 using richtext::expectBodies;
 using richtext::Row;
@@ -166,6 +173,53 @@ TEST(RichTextReader, ReplacesTheDocumentAndKeepsNoUndoSteps)
     EXPECT_TRUE(document.isUndoRedoEnabled());
     EXPECT_FALSE(document.isUndoAvailable());
     EXPECT_FALSE(document.isModified());
+}
+
+/// Rich texts of all kinds: those of the reports, and those that were found to be hard.
+QList<QByteArray> manyRichTexts()
+{
+    QList<QByteArray> texts;
+    for (const QString &folder : {QStringLiteral(KAREPORT_TEST_DIR "/golden"),
+                                  QStringLiteral(KAREPORT_TEST_DIR "/../fuzz/corpus/FuzzRichText")})
+    {
+        for (const QFileInfo &info : QDir(folder).entryInfoList(QDir::Files, QDir::Name)) {
+            QFile file(info.filePath());
+            if (file.open(QIODevice::ReadOnly)) {
+                texts.append(file.readAll());
+            }
+        }
+    }
+    return texts;
+}
+
+TEST(RichTextReader, ReadsTheCharactersAloneAsADocumentHasThem)
+{
+    const QList<QByteArray> texts = manyRichTexts();
+    ASSERT_GT(texts.size(), 20);
+    std::mt19937 random(20240305);
+    for (int round = 0; round < 1500; ++round) {
+        QByteArray bytes = texts[round % texts.size()];
+        // Behind the first rounds, with pieces cut out and doubled.
+        for (int cut = 0; round >= texts.size() && cut < 3 && bytes.size() > 10; ++cut) {
+            const qsizetype at = 6 + static_cast<qsizetype>(random()) % (bytes.size() - 6);
+            const qsizetype count = std::min<qsizetype>(static_cast<qsizetype>(random()) % 20, bytes.size() - at);
+            const QByteArray piece = bytes.mid(at, count);
+            random() % 2 == 0 ? bytes.remove(at, count) : bytes.insert(at, piece);
+        }
+        QTextDocument document;
+        kareport::RichTextNotes notes;
+        const auto error = kareport::readRichText(QByteArrayView(bytes), document, &notes);
+        QString text = QStringLiteral("old");
+        kareport::RichTextNotes textNotes;
+        const auto textError = kareport::readRichTextCharacters(bytes, text, &textNotes);
+        ASSERT_EQ(text, document.toRawText()) << bytes.constData();
+        ASSERT_EQ(error.has_value(), textError.has_value());
+        if (error) {
+            ASSERT_EQ(error->text, textError->text);
+            ASSERT_EQ(error->place.line, textError->place.line);
+        }
+        ASSERT_EQ(notes.texts(), textNotes.texts());
+    }
 }
 
 } // namespace

@@ -720,6 +720,11 @@
         <translation>mehr als %1 MB kommen aus einer Quelle, die keine Datei ist</translation>
     </message>
     <message>
+        <location filename="../apps/kareport/FileBytes.cpp"/>
+        <source>the file was cut short while it was read</source>
+        <translation>die Datei wurde beim Lesen abgeschnitten</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/JobList.cpp"/>
         <source>standard input cannot be read: %1</source>
         <translation>die Standardeingabe kann nicht gelesen werden: %1</translation>
@@ -961,13 +966,13 @@
     </message>
     <message>
         <location filename="../apps/kareport/OutputWriter.cpp"/>
-        <source>"%1" could not be written: %2</source>
-        <translation>„%1“ konnte nicht geschrieben werden: %2</translation>
+        <source>the report begins as rich text, but %1 (line %2, column %3)</source>
+        <translation>der Bericht beginnt als Rich-Text, aber %1 (Zeile %2, Spalte %3)</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputWriter.cpp"/>
-        <source>the report begins as rich text, but %1 (line %2, column %3)</source>
-        <translation>der Bericht beginnt als Rich-Text, aber %1 (Zeile %2, Spalte %3)</translation>
+        <source>"%1" could not be written: %2</source>
+        <translation>„%1“ konnte nicht geschrieben werden: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputsWriter.cpp"/>
@@ -976,13 +981,13 @@
     </message>
     <message>
         <location filename="../apps/kareport/OutputsWriter.cpp"/>
-        <source>Writing %1</source>
-        <translation>%1 wird geschrieben</translation>
+        <source>kareport: the report is empty: "%1" was not written</source>
+        <translation>kareport: der Bericht ist leer: „%1“ wurde nicht geschrieben</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputsWriter.cpp"/>
-        <source>kareport: the report is empty: "%1" was not written</source>
-        <translation>kareport: der Bericht ist leer: „%1“ wurde nicht geschrieben</translation>
+        <source>Writing %1</source>
+        <translation>%1 wird geschrieben</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>

@@ -720,6 +720,11 @@
         <translation>ファイルではない入力から %1 MB を超えるデータが読み込まれました</translation>
     </message>
     <message>
+        <location filename="../apps/kareport/FileBytes.cpp"/>
+        <source>the file was cut short while it was read</source>
+        <translation>読み込み中にファイルが切り詰められました</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/JobList.cpp"/>
         <source>standard input cannot be read: %1</source>
         <translation>標準入力を読み込めません: %1</translation>
@@ -961,13 +966,13 @@
     </message>
     <message>
         <location filename="../apps/kareport/OutputWriter.cpp"/>
-        <source>"%1" could not be written: %2</source>
-        <translation>「%1」に書き込めませんでした: %2</translation>
+        <source>the report begins as rich text, but %1 (line %2, column %3)</source>
+        <translation>帳票はリッチテキストで始まっていますが、エラーがあります: %1 (%2 行 %3 桁)</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputWriter.cpp"/>
-        <source>the report begins as rich text, but %1 (line %2, column %3)</source>
-        <translation>帳票はリッチテキストで始まっていますが、エラーがあります: %1 (%2 行 %3 桁)</translation>
+        <source>"%1" could not be written: %2</source>
+        <translation>「%1」に書き込めませんでした: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputsWriter.cpp"/>
@@ -976,13 +981,13 @@
     </message>
     <message>
         <location filename="../apps/kareport/OutputsWriter.cpp"/>
-        <source>Writing %1</source>
-        <translation>書き込み中: %1</translation>
+        <source>kareport: the report is empty: "%1" was not written</source>
+        <translation>kareport: 帳票が空です: 「%1」は書き込まれませんでした</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputsWriter.cpp"/>
-        <source>kareport: the report is empty: "%1" was not written</source>
-        <translation>kareport: 帳票が空です: 「%1」は書き込まれませんでした</translation>
+        <source>Writing %1</source>
+        <translation>書き込み中: %1</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>

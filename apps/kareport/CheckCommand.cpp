@@ -1,5 +1,6 @@
 #include "Commands.h"
 
+#include "Progress.h"
 #include "TemplateCheck.h"
 #include "TemplateSource.h"
 
@@ -15,6 +16,7 @@ void printLine(const QString &line)
 
 void printError(const QString &line)
 {
+    eraseProgress();
     std::fprintf(stderr, "%s\n", line.toUtf8().constData());
 }
 

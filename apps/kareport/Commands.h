@@ -23,11 +23,11 @@ enum ExitStatus
 /// `kareport render`
 struct RenderCommand
 {
-    QStringList jobs;          ///< job files
-    QString jobList;           ///< a file that names job files; "-" for standard input, empty for none
-    QString slice;             ///< "3/8" for the third of eight parts of all these jobs; empty for all of them
-    bool onlyOutdated = false; ///< leave jobs out whose outputs are up to date
-    TemplateJob templateJob;   ///< the short form: no job file
+    QStringList jobs;             ///< job files
+    QString jobList;              ///< a file that names job files; "-" for standard input, empty for none
+    std::optional<QString> slice; ///< "3/8" for the third of eight parts of all these jobs; none for all of them
+    bool onlyOutdated = false;    ///< leave jobs out whose outputs are up to date
+    TemplateJob templateJob;      ///< the short form: no job file
     QStringList outputs;
     QString as;
     QStringList sets;

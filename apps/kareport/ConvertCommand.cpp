@@ -12,7 +12,6 @@
 #include "Xlate.h"
 
 #include <QJsonArray>
-#include <QTextDocument>
 
 #include <new>
 
@@ -43,13 +42,10 @@ std::optional<InputError> readText(const QString &path, QByteArrayView bytes, Sa
 
 std::optional<InputError> readRichText(const QString &path, QByteArrayView bytes, SavedReport &saved)
 {
-    QTextDocument document;
     RichTextNotes notes;
-    if (const auto error = kareport::readRichText(bytes, document, &notes)) {
+    if (const auto error = readRichTextCharacters(bytes, saved.text, &notes)) {
         return InputError{path, error->place, error->text};
     }
-    // Not as plain text, which has blanks for no-break spaces.
-    saved.text = document.toRawText();
     for (QChar &character : saved.text) {
         if (character == QChar::ParagraphSeparator || character == QChar::LineSeparator) {
             character = u'\n';
@@ -107,10 +103,6 @@ ExitStatus ConvertCommand::run(int &argc, char **argv) const
     const QByteArrayView bytes(view.data(), static_cast<qsizetype>(view.size()));
     const QByteArrayView richText = richTextIn(bytes);
     const bool isRich = !richText.isEmpty();
-    std::unique_ptr<QCoreApplication> application;
-    if (isRich) {
-        application = startQt(argc, argv, true);
-    }
     SavedReport saved;
     std::optional<InputError> error = isRich ? readRichText(input, richText, saved) : readText(input, bytes, saved);
     if (error) {
@@ -123,9 +115,7 @@ ExitStatus ConvertCommand::run(int &argc, char **argv) const
             job.outputs.front().kind == OutputKind::Pdf ? linesOfPages(saved.text) : PageGeometry().linesPerPage;
     }
     job.page.charsPerRow = job.page.charsPerRow.value_or(PageGeometry().charsPerRow);
-    if (!application) {
-        application = startQt(argc, argv, JobRunner::needsFonts(job) || needsFonts(job.outputs));
-    }
+    const auto application = startQt(argc, argv, JobRunner::needsFonts(job) || needsFonts(job.outputs));
     Progress bar(progress);
     JobRunner runner(job, source, bar);
     error = runner.run();

@@ -2,6 +2,8 @@
 
 #include "Xlate.h"
 
+#include <algorithm>
+
 namespace kareport
 {
 
@@ -28,10 +30,13 @@ Expected<std::shared_ptr<const FileBytes>> FileBytes::open(const QString &path)
         bytes->view_ = {reinterpret_cast<const char *>(mapped), static_cast<std::size_t>(size)};
         return std::shared_ptr<const FileBytes>(std::move(bytes));
     }
-    bytes->content_ = bytes->file_.read(size > 0 ? size : largestUnmapped + 1);
+    bytes->content_ = bytes->file_.read(size > 0 ? std::min(size, largestUnmapped + 1) : largestUnmapped + 1);
     if (bytes->content_.size() > largestUnmapped) {
         return InputError{path, TextPlace(),
                           Xlate("more than %1 MB come out of what is no file").arg(largestUnmapped >> 20)};
+    }
+    if (bytes->content_.size() < size) {
+        return InputError{path, std::nullopt, Xlate("the file was cut short while it was read")};
     }
     if (bytes->file_.error() != QFileDevice::NoError) {
         return InputError{path, std::nullopt, bytes->file_.errorString()};

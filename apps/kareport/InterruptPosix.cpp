@@ -26,7 +26,8 @@ extern "C" void noteInterrupt(int /*signal*/)
 /// A mapped file that somebody cuts short cannot be read any more.
 extern "C" void endForLostFile(int /*signal*/)
 {
-    constexpr char message[] = "kareport: error: a data file was cut short while it was read; nothing was written\n";
+    constexpr char message[] =
+        "kareport: error: a data file was cut short while it was read; its report was not written\n";
     constexpr int exitInput = 2;
     const auto written = write(STDERR_FILENO, message, sizeof message - 1);
     _exit(written < 0 ? exitInput + 1 : exitInput);

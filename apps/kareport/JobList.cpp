@@ -54,6 +54,10 @@ Expected<QStringList> readJobList(const QString &path)
                               Xlate("standard input cannot be read: %1").arg(input.errorString())};
         }
         bytes = input.readAll();
+        if (input.error() != QFileDevice::NoError) {
+            return InputError{QString(), std::nullopt,
+                              Xlate("standard input cannot be read: %1").arg(input.errorString())};
+        }
     } else {
         const auto file = FileBytes::open(path);
         if (const InputError *error = errorOf(file)) {

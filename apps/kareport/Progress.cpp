@@ -8,7 +8,20 @@ namespace kareport
 
 namespace
 {
+
 constexpr qint64 millisecondsBetween = 100;
+
+qsizetype shownWidth = 0; ///< of the line on standard error; there is one for all
+
+} // namespace
+
+void eraseProgress()
+{
+    if (shownWidth > 0) {
+        std::fprintf(stderr, "\r%s\r", qUtf8Printable(QString(shownWidth, u' ')));
+        std::fflush(stderr);
+        shownWidth = 0;
+    }
 }
 
 void Progress::begin(const QString &what, std::size_t total)
@@ -41,17 +54,16 @@ void Progress::show(std::size_t done)
     if (total_ > 0) {
         line += QStringLiteral(" %1 %").arg(std::min(done, total_) * 100 / total_);
     }
-    std::fprintf(stderr, "\r%s", qUtf8Printable(line.leftJustified(width_)));
+    std::fprintf(stderr, "\r%s", qUtf8Printable(line.leftJustified(shownWidth)));
     std::fflush(stderr);
-    width_ = std::max(width_, line.size());
+    shownWidth = std::max(shownWidth, line.size());
 }
 
 void Progress::finish()
 {
-    if (width_ > 0) {
-        std::fprintf(stderr, "\r%s\r", qUtf8Printable(QString(width_, u' ')));
-        std::fflush(stderr);
-        width_ = 0;
+    // Of many short works the next one follows at once.
+    if (prefix_.isEmpty()) {
+        eraseProgress();
     }
 }
 

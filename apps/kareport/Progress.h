@@ -8,6 +8,9 @@
 namespace kareport
 {
 
+/// Takes what is shown of any progress off standard error, so that something else can be printed.
+void eraseProgress();
+
 /// Shows how far long work has come: on standard error, unless something else does.
 class Progress
 {
@@ -26,7 +29,7 @@ public:
     void advance(std::size_t done);
     /// The same for work whose amount shows only on the way.
     void advance(std::size_t done, std::size_t total);
-    /// Takes the line off the screen.
+    /// Ends a piece of work: the line goes, unless the work is one of many.
     virtual void finish();
 
 protected:
@@ -40,7 +43,6 @@ private:
     QString what_;
     std::size_t total_ = 0;
     QElapsedTimer sinceShown_;
-    qsizetype width_ = 0;
 };
 
 } // namespace kareport

@@ -12,23 +12,43 @@
 namespace kareport
 {
 
+namespace
+{
+
+/// The file that an output becomes, without links on the way; empty for what is no file and so loses nothing when it is
+/// written to twice.
+QString fileOf(const Output &output)
+{
+    const QFileInfo info(output.file);
+    if (output.isStandardOutput() || (info.exists() && !info.isFile())) {
+        return QString();
+    }
+    const QString folder = QFileInfo(info.absolutePath()).canonicalFilePath();
+    return info.exists() ? info.canonicalFilePath() : folder + u'/' + info.fileName();
+}
+
+} // namespace
+
 ExitStatus RenderBatch::run(const QStringList &jobs)
 {
     ExitStatus worst = exitDone;
     for (qsizetype i = 0; i < jobs.size() && worst != exitInterrupted; ++i) {
+        if (isInterrupted()) {
+            worst = exitInterrupted;
+            break;
+        }
         progress_.setPrefix(QStringLiteral("%1/%2 ").arg(i + 1).arg(jobs.size()));
         progress_.begin(jobs[i], 0);
         ExitStatus status = exitInput;
         try {
             status = make(jobs[i]);
         } catch (const std::bad_alloc &) {
-            progress_.finish();
             printError(InputError{jobs[i], std::nullopt, Xlate("there is not enough memory for this job")}.message());
         }
         failed_ += status == exitDone || status == exitInterrupted ? 0 : 1;
-        worst = isInterrupted() ? exitInterrupted : std::max(worst, status);
+        worst = std::max(worst, status);
     }
-    progress_.finish();
+    eraseProgress();
     if (!command_.quiet || worst == exitInterrupted) {
         sayWhatWasDone(jobs.size());
     }
@@ -38,38 +58,42 @@ ExitStatus RenderBatch::run(const QStringList &jobs)
 ExitStatus RenderBatch::make(const QString &path)
 {
     RenderJob job(command_, JsonSource::read(path));
-    if (job.status() != exitDone || takesFileOfAnother(job, path)) {
+    if (job.status() != exitDone || takesFileOfAnother(job)) {
         return job.status();
     }
     if (command_.onlyOutdated && isUpToDate(job.job(), path)) {
+        noteFiles(job.job(), path);
         ++upToDate_;
         return exitDone;
     }
     const ExitStatus status = job.run(progress_);
-    made_ += status == exitDone ? 1 : 0;
+    if (status == exitDone) {
+        noteFiles(job.job(), path);
+        ++made_;
+    }
     return status;
 }
 
-/// Whether an earlier job writes a file that this one writes too: one of the two reports would be lost.
-bool RenderBatch::takesFileOfAnother(RenderJob &job, const QString &path)
+/// Whether an earlier job has written a file that this one writes too: one of the two reports would be lost.
+bool RenderBatch::takesFileOfAnother(RenderJob &job)
 {
     for (const Output &output : job.job().outputs) {
-        if (output.isStandardOutput()) {
-            continue;
-        }
-        const QString file = QFileInfo(output.file).absoluteFilePath();
-        if (const auto writer = writers_.constFind(file); writer != writers_.constEnd()) {
+        if (const auto writer = writers_.constFind(fileOf(output)); writer != writers_.constEnd()) {
             job.fail(Xlate("\"%1\" is written by the job \"%2\" already: an output of its own was expected")
                          .arg(output.file, *writer));
             return true;
         }
     }
-    for (const Output &output : job.job().outputs) {
-        if (!output.isStandardOutput()) {
-            writers_.insert(QFileInfo(output.file).absoluteFilePath(), path);
+    return false;
+}
+
+void RenderBatch::noteFiles(const Job &job, const QString &path)
+{
+    for (const Output &output : job.outputs) {
+        if (const QString file = fileOf(output); !file.isEmpty()) {
+            writers_.insert(file, path);
         }
     }
-    return false;
 }
 
 void RenderBatch::sayWhatWasDone(qsizetype jobs) const

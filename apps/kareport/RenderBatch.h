@@ -19,12 +19,13 @@ public:
 
 private:
     ExitStatus make(const QString &path);
-    bool takesFileOfAnother(RenderJob &job, const QString &path);
+    bool takesFileOfAnother(RenderJob &job);
+    void noteFiles(const Job &job, const QString &path);
     void sayWhatWasDone(qsizetype jobs) const;
 
     const RenderCommand &command_;
     Progress progress_;
-    QHash<QString, QString> writers_; ///< output file, job that writes it
+    QHash<QString, QString> writers_; ///< files that were written, jobs that wrote them
     qsizetype made_ = 0;
     qsizetype upToDate_ = 0;
     qsizetype failed_ = 0;

@@ -19,7 +19,7 @@ bool RenderCommand::isShort() const
 
 bool RenderCommand::isBatch() const
 {
-    return jobs.size() > 1 || !jobList.isEmpty() || !slice.isEmpty();
+    return jobs.size() > 1 || !jobList.isEmpty() || slice;
 }
 
 std::optional<QString> RenderCommand::usageError() const
@@ -40,11 +40,11 @@ std::optional<QString> RenderCommand::wrongSource() const
     {
         return Xlate("--template, --name, --data and one of --table and --block were expected");
     }
-    if (isShort() && !slice.isEmpty()) {
+    if (isShort() && slice) {
         return Xlate("--slice takes a part of several job files: these were expected");
     }
-    if (!slice.isEmpty() && !JobSlice::fromText(slice)) {
-        return Xlate("--slice \"%1\": a number, a slash and the count of slices were expected, as in 3/8").arg(slice);
+    if (slice && !JobSlice::fromText(*slice)) {
+        return Xlate("--slice \"%1\": a number, a slash and the count of slices were expected, as in 3/8").arg(*slice);
     }
     return std::nullopt;
 }
@@ -77,7 +77,7 @@ ExitStatus RenderCommand::run(int &argc, char **argv) const
             all += std::get<QStringList>(listed);
         }
         const auto application = startQt(argc, argv, true);
-        return RenderBatch(*this).run(slice.isEmpty() ? all : JobSlice::fromText(slice)->of(all));
+        return RenderBatch(*this).run(slice ? JobSlice::fromText(*slice)->of(all) : all);
     }
     RenderJob job(*this, isShort() ? Expected<JsonSource>(JsonSource::fromObject(templateJob.toJson()))
                                    : JsonSource::read(jobs.first()));

@@ -96,27 +96,33 @@ ExitStatus RenderJob::madeStatus(const std::optional<InputError> &error)
 std::optional<ExitStatus> RenderJob::runIntoOutput(JobRunner &runner, const Output &output, Progress &progress)
 {
     bool isOpen = false;
+    bool isMade = false;
+    bool isLeftOut = false;
     bool isEmpty = false;
     std::optional<InputError> inputError;
-    auto outputError = replaceOutput(output, [&](QIODevice &device) {
+    const auto outputError = replaceOutput(output, [&](QIODevice &device) {
         isOpen = true;
         ReportTextWriter writer(device, output.kind == OutputKind::Report ? LineEnds::ReportFile : LineEnds::PlainText);
         inputError = runner.run(&writer);
         if (inputError || isInterrupted()) {
+            if (UReportDoc *report = runner.madeReport()) {
+                report->StreamText(nullptr);
+            }
             return false;
         }
+        isMade = true;
         const bool isWritten = runner.report().EndTextStream(writer);
         isEmpty = isWritten && writer.isEmpty();
-        return isWritten && !(isEmpty && output.kind == OutputKind::Report); // an empty report makes no file
+        isLeftOut = isEmpty && output.kind == OutputKind::Report; // an empty report makes no file
+        return isWritten && !isLeftOut;
     });
     if (!isOpen) {
         return std::nullopt;
     }
     progress.finish();
-    if (const ExitStatus made = madeStatus(inputError); made != exitDone) {
-        return made;
-    }
-    return sayWritten(output, isEmpty ? std::nullopt : outputError, isEmpty, command_.quiet);
+    // What comes when the report is made is too late to stop it.
+    return isMade ? sayWritten(output, isLeftOut ? std::nullopt : outputError, isEmpty, command_.quiet)
+                  : madeStatus(inputError);
 }
 
 ExitStatus RenderJob::run(Progress &progress)

@@ -3,6 +3,7 @@
 #include "Xlate.h"
 
 #include <new>
+#include <system_error>
 
 namespace kareport
 {
@@ -47,8 +48,12 @@ const RowBatch &RowBatches::next()
     RowBatch &batch = batches_[used_];
     if (!thread_.joinable()) {
         fill(batch);
-        if (!batch.isLast) {
-            thread_ = std::jthread([this](const std::stop_token &stop) { readAhead(stop); });
+        if (!batch.isLast && !isAlone_) {
+            try {
+                thread_ = std::jthread([this](const std::stop_token &stop) { readAhead(stop); });
+            } catch (const std::system_error &) {
+                isAlone_ = true; // the user has as many threads as are allowed: then without one
+            }
         }
         return batch;
     }

@@ -58,6 +58,7 @@ private:
     std::function<void(RowBatch &)> fill_;
     std::array<RowBatch, 2> batches_;
     std::size_t used_ = 1;               ///< the batch that was handed out last
+    bool isAlone_ = false;               ///< no thread could be had
     std::counting_semaphore<3> free_{1}; // and one that lets the thread go at the end
     std::counting_semaphore<2> ready_{0};
     std::jthread thread_;

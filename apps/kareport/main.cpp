@@ -5,6 +5,7 @@
 
 #include <cstdio>
 #include <new>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -37,7 +38,7 @@ struct RenderOptions
 {
     std::vector<std::string> jobs;
     std::string jobList;
-    std::string slice;
+    std::optional<std::string> slice;
     bool onlyOutdated = false;
     std::string templateFile;
     std::string templateName;
@@ -54,7 +55,7 @@ struct RenderOptions
     {
         return {texts(jobs),
                 text(jobList),
-                text(slice),
+                slice ? std::optional(text(*slice)) : std::nullopt,
                 onlyOutdated,
                 {text(templateFile), text(templateName), text(table), text(block), text(data)},
                 texts(outputs),

@@ -11,15 +11,16 @@ from units import readable  # noqa: E402
 
 OURS = "#1b6e8c"
 OTHERS = "#b8bfc6"
+BOUND = "#e4e7ea"
 
 
 def draw(path, title, bars):
-    """@param bars  name, seconds, ours: from the least to the most"""
+    """@param bars  name, seconds, ours, a bound: from the least to the most"""
     matplotlib.rcParams.update({"svg.hashsalt": "kareport", "font.family": "DejaVu Sans", "font.size": 10})
     figure, axes = pyplot.subplots(figsize=(7.2, 0.9 + 0.42 * len(bars)), layout="constrained")
     names = [bar[0] for bar in bars]
     values = [bar[1] for bar in bars]
-    drawn = axes.barh(names, values, color=[OURS if bar[2] else OTHERS for bar in bars], height=0.62)
+    drawn = axes.barh(names, values, color=[OURS if bar[2] else BOUND if bar[3] else OTHERS for bar in bars], height=0.62)
     axes.bar_label(drawn, [readable(value) for value in values], padding=4)
     axes.invert_yaxis()
     axes.set_title(title, loc="left", fontsize=11)

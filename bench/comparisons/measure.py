@@ -18,6 +18,7 @@ class Command:
     environment: dict = dataclasses.field(default_factory=dict)
     most_seconds: float = 900
     ours: bool = False
+    bound: bool = False  # no program for this work, but what the work can take at the least
 
 
 @dataclasses.dataclass
@@ -25,6 +26,7 @@ class Result:
     """What the runs of one command came to."""
     name: str
     ours: bool = False
+    bound: bool = False
     seconds: list = dataclasses.field(default_factory=list)
     peak_kb: int = 0
     note: str = ""
@@ -77,7 +79,7 @@ def _wait(process, deadline):
 def in_turn(commands, folder, runs, slow=20):
     """Runs every command `runs` times, one after the other and again, behind a first turn that only warms up. A command
     whose warm-up takes more than `slow` seconds is run twice at most, and its warm-up counts."""
-    results = {command.name: Result(command.name, command.ours) for command in commands}
+    results = {command.name: Result(command.name, command.ours, command.bound) for command in commands}
     most = {command.name: runs for command in commands}
     for turn in range(runs + 1):
         for command in commands:

@@ -21,7 +21,7 @@ def machine():
 def table(comparison):
     rows = ["| program | median | least | most | peak MB |", "|---|---|---|---|---|"]
     for result in sorted(comparison.results, key=lambda result: result.median or float("inf")):
-        name = f"**{result.name}**" if result.ours else result.name
+        name = f"**{result.name}**" if result.ours else f"*{result.name}*" if result.bound else result.name
         if result.median is None:
             rows.append(f"| {name} | {result.note or 'not measured'} | | | |")
             continue
@@ -69,7 +69,7 @@ def draw(comparisons):
     """Makes the pictures. @return their names for the page"""
     pictures = []
     for comparison in comparisons:
-        bars = sorted(((result.name, result.median, result.ours) for result in comparison.results
+        bars = sorted(((result.name, result.median, result.ours, result.bound) for result in comparison.results
                        if result.median is not None), key=lambda bar: bar[1])
         pictures.append({"path": os.path.join(DOCS, f"pictures/performance-{comparison.key}.svg"),
                          "title": comparison.title, "bars": bars})

@@ -1,6 +1,6 @@
 """Pages of text to a PDF with an embedded face."""
 from measure import Command, in_turn
-from work import Comparison, Limit, make, ratio
+from work import Comparison, Limit, make, ratio, share
 
 LINES = 72
 REPORTLAB = """
@@ -54,6 +54,8 @@ def run(surroundings):
                 Command("enscript, ps2pdf", ["sh", "-c", ENSCRIPT]),
                 Command("LibreOffice", ["soffice", "--headless", f"-env:UserInstallation=file://{folder}/office",
                                         "--convert-to", "pdf", "pages.txt"]),
+                Command("compressing the pages alone", [f"{surroundings.bench}/ka_file_work", "deflate", "pages.rep"],
+                        own_clock=True, bound=True),
             ], folder, runs)
         ours = next(result for result in results if result.ours)
         comparisons.append(Comparison(
@@ -61,5 +63,5 @@ def run(surroundings):
             f"{pages:,} pages of {LINES} lines of 80 characters, from a file to a PDF with its face in it, compressed. "
             "LibreOffice has the text only and breaks the pages itself.", results,
             [Limit("time, of the fastest other", ratio(results, "kareport"), 1.0)],
-            extra=[f"kareport: {pages / ours.median:,.0f} pages a second."]))
+            extra=[f"kareport: {pages / ours.median:,.0f} pages a second. {share(results, 'kareport')}"]))
     return comparisons

@@ -1,7 +1,7 @@
 """Report text to a report file and back."""
 from measure import Command, in_turn
 from pages import lines
-from work import Comparison, Limit, make, ratio
+from work import Comparison, Limit, make, ratio, share
 
 
 def make_files(folder, megabytes):
@@ -22,7 +22,8 @@ def run(surroundings):
             Command("iconv to UTF-8", ["iconv", "-f", "UTF-16LE", "-t", "UTF-8", "-o", "to8.txt", "text.utf16"]),
             Command("kareport, loaded", [work, "load", "saved.rep"], own_clock=True, ours=True),
             Command("iconv to UTF-16", ["iconv", "-f", "UTF-8", "-t", "UTF-16LE", "-o", "to16.txt", "text.utf8"]),
-            Command("bytes copied", [work, "copy", "text.utf8", "copy.txt"], own_clock=True),
+            Command("copying the bytes alone", [work, "copy", "text.utf8", "copy.txt"], own_clock=True,
+                    bound=True),
         ], folder, surroundings.runs)
     return [Comparison(
         "report-file", f"{megabytes} MB of report text to a report file and back",
@@ -30,4 +31,5 @@ def run(surroundings):
         "changes every line end on the way; iconv reads and writes files. Copying the bytes of such a file is what the "
         "machine itself needs.", results,
         [Limit("saving, of iconv", ratio(results, "kareport, saved", ["iconv to UTF-8"]), 0.5),
-         Limit("loading, of iconv", ratio(results, "kareport, loaded", ["iconv to UTF-16"]), 0.5)])]
+         Limit("loading, of iconv", ratio(results, "kareport, loaded", ["iconv to UTF-16"]), 0.5)],
+        extra=[f"Saving: {share(results, 'kareport, saved')}"])]

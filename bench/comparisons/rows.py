@@ -52,6 +52,8 @@ def make_files(folder, rows):
 def commands(surroundings, folder):
     return [
         Command("kareport", [surroundings.kareport, "render", "points.json"], ours=True),
+        # It is there once kareport has run.
+        Command("copying the report's bytes alone", ["cp", "points.rep", "copy.rep"], bound=True),
         Command("mawk printf", ["mawk", "-F,", AWK, "points.csv"], f"{folder}/mawk.txt"),
         Command("gawk printf", ["gawk", "-F,", AWK, "points.csv"], f"{folder}/gawk.txt",
                 environment={"LC_ALL": "C"}),

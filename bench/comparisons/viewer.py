@@ -10,7 +10,7 @@ from pages import lines
 from screen import Screen, until_change, until_quiet
 from work import Comparison, Limit, make, ratio
 
-KEYS = 15
+KEYS = 30
 SCROLL_BAR = 8  # pixels from the right edge of the window to the middle of its scroll bar
 
 
@@ -59,11 +59,12 @@ class Watched:
         # Right of the cursor, whose blinking would count as a change.
         area = (left + 60, row - 4, 160, 8)
         seconds = []
-        for _ in range(KEYS):
+        for turn in range(KEYS):
             before = self.screen.pixels(area)
             begin = time.perf_counter()
-            self.screen.key("x")
+            self.screen.key("xy"[turn % 2])  # no two pictures alike
             seconds.append(until_change(self.screen, area, before, begin))
+            self.screen.key("Left")  # the cursor stays outside of the area
             time.sleep(0.2)
         # The first key in a new place prepares more than the others do.
         return statistics.median(seconds[1:]) if all(seconds) else None

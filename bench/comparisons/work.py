@@ -59,9 +59,17 @@ def make(function, *arguments):
         raise SystemExit(f"{function.__name__} failed")
 
 
+def share(results, ours):
+    """How much of our time is what the work takes at the least."""
+    own = next(result.median for result in results if result.name == ours)
+    least = next(result.median for result in results if result.bound)
+    return f"{least / own:.0%} of our time is {next(result.name for result in results if result.bound)}."
+
+
 def ratio(results, ours, others=None):
     """Our median over the fastest of the others; nothing when either is missing."""
     own = next((result.median for result in results if result.name == ours), None)
     rest = [result.median for result in results
-            if result.median is not None and not result.ours and (others is None or result.name in others)]
+            if result.median is not None and not result.ours and not result.bound and
+            (others is None or result.name in others)]
     return own / min(rest) if own is not None and rest else None
