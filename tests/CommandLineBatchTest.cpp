@@ -1,6 +1,7 @@
 #include "CommandLine.h"
 
 #include <QDateTime>
+#include <QDir>
 #include <QFile>
 #include <QFileInfo>
 
@@ -163,6 +164,66 @@ TEST(CommandLineBatch, AJobThatFailsDoesNotKeepTheOthersFromBeingMade)
     }
 }
 
+TEST(CommandLineBatch, NoTwoJobsWriteOneFile)
+{
+    struct Row
+    {
+        const char *first;  ///< output of the first job
+        const char *second; ///< output of the second
+        int status;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {"one.txt", "two.txt", 0, "two files"},
+        {"one.txt", "one.txt", 2, "one file"},
+        {"one.txt", "./one.txt", 2, "by another way"},
+        {"one.txt", "folder/../one.txt", 2, "by another folder"},
+        {"link.txt", "target.txt", 2, "a link to the other's file"},
+        {"target.txt", "link.txt", 2, "the other way round"},
+        {"folder/new.txt", "linked/new.txt", 2, "a folder with two names"},
+        {"folder/one.txt", "one.txt", 0, "one name in two folders"},
+    };
+    for (const Row &row : rows) {
+        const BatchFolder folder;
+        ASSERT_TRUE(QDir(folder.path()).mkdir(QStringLiteral("folder")));
+        folder.put("target.txt", "old");
+        ASSERT_TRUE(QFile::link(QStringLiteral("target.txt"), folder.path("link.txt")));
+        ASSERT_TRUE(QFile::link(QStringLiteral("folder"), folder.path("linked")));
+        folder.put("1.json", lineJob("first", row.first));
+        folder.put("2.json", lineJob("second", row.second));
+        const ProgramRun run = folder.run("render 1.json 2.json");
+        EXPECT_EQ(run.status, row.status) << row.reason << "\n" << run.all().constData();
+        EXPECT_EQ(folder.bytesOf(row.first), "first\n") << row.reason;
+        EXPECT_EQ(folder.bytesOf(row.second), row.status == 0 ? "second\n" : "first\n") << row.reason;
+    }
+    // A job that has written nothing keeps its file for nobody, and what is no file loses nothing.
+    const BatchFolder folder;
+    folder.put("bad.json", lineJob("x", "one.txt", "\"template\": {\"file\": \"none.xml\", \"name\": \"N\"}, "));
+    folder.put("good.json", lineJob("good", "one.txt"));
+    EXPECT_EQ(folder.run("render bad.json good.json").status, 2);
+    EXPECT_EQ(folder.bytesOf("one.txt"), "good\n");
+    EXPECT_EQ(folder.run("render a.json b.json -o /dev/null --as text -o {}.txt").status, 1) << "one name for two jobs";
+    folder.put("1.json",
+               lineJob("x", "/dev/null").replace("\"/dev/null\"", "{\"file\": \"/dev/null\", \"as\": \"text\"}"));
+    folder.put("2.json", folder.bytesOf("1.json"));
+    EXPECT_EQ(folder.run("render 1.json 2.json").status, 0);
+}
+
+TEST(CommandLineBatch, AListThatCannotBeReadIsNoEmptyList)
+{
+    const BatchFolder folder;
+    QProcess process;
+    process.setWorkingDirectory(folder.path());
+    // A folder opens, and cannot be read.
+    process.start(QStringLiteral("sh"), {QStringLiteral("-c"), QStringLiteral("exec \"$0\" render --jobs - < ."),
+                                         QStringLiteral(KAREPORT_PROGRAM)});
+    ASSERT_TRUE(process.waitForFinished(60'000));
+    const QByteArray err = process.readAllStandardError();
+    EXPECT_EQ(process.exitCode(), 2) << err.constData();
+    EXPECT_TRUE(err.contains("standard input cannot be read")) << err.constData();
+    EXPECT_EQ(folder.run("render --jobs none.txt").status, 2);
+}
+
 TEST(CommandLineBatch, OutputsOfTheCommandLineTellTheJobsApart)
 {
     struct Row
@@ -204,6 +265,7 @@ TEST(CommandLineBatch, AWrongCommandLineIsStatus1)
         {"render a.json --slice 3", "no count"},
         {"render a.json --slice 3/2", "beyond the count"},
         {"render a.json --slice 1/", "a variable that is not set"},
+        {"render a.json --slice=", "nothing at all, as of a variable that is not set"},
         {"render --slice 1/2", "a slice of nothing"},
         {"render --jobs list --template t.xml --name CONTROL --table Points --data points.csv",
          "a list and the short form"},

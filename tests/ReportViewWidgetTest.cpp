@@ -11,8 +11,10 @@ namespace
 
 using kareport::ReportViewWidget;
 
+/// The place that is shown, which follows the text on the screen.
 QString placeIn(const ReportViewWidget &widget)
 {
+    QCoreApplication::processEvents();
     return QStringList{widget.pageLabel().text(), widget.lineLabel().text(), widget.columnLabel().text()}.join(
         QStringLiteral(", "));
 }

@@ -73,8 +73,12 @@ ReportViewWidget::ReportViewWidget(QWidget *parent)
 
     setFocusProxy(edit_);
     edit_->setZoomHandler([this] { showZoom(); });
-    connect(edit_, &QPlainTextEdit::cursorPositionChanged, this, [this] { showPlace(); });
-    connect(edit_, &QPlainTextEdit::blockCountChanged, this, [this] { showPlace(); });
+    // What a key writes is on the screen before the place below it.
+    placeTimer_.setSingleShot(true);
+    placeTimer_.setInterval(0);
+    connect(&placeTimer_, &QTimer::timeout, this, [this] { showPlace(); });
+    connect(edit_, &QPlainTextEdit::cursorPositionChanged, &placeTimer_, qOverload<>(&QTimer::start));
+    connect(edit_, &QPlainTextEdit::blockCountChanged, &placeTimer_, qOverload<>(&QTimer::start));
     for (QWidget *child : findChildren<QWidget *>()) {
         child->installEventFilter(this); // wherever the mouse is pressed
     }

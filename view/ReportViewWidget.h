@@ -2,6 +2,7 @@
 
 #include "KaReportExport.h"
 
+#include <QTimer>
 #include <QWidget>
 
 #include <functional>
@@ -68,6 +69,7 @@ private:
     QLabel *lineLabel_;
     QLabel *columnLabel_;
     QLabel *zoomLabel_;
+    QTimer placeTimer_; ///< shows the place anew
     std::function<int()> linesPerPage_;
     std::function<void()> pressed_;
 };

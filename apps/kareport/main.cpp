@@ -170,7 +170,7 @@ int runProgram(int argc, char **argv)
     program.name("kareport");
     program.set_version_flag("--version", "kareport " KAREPORT_VERSION);
     program.require_subcommand(1);
-    program.footer("Exit status: 0 done, 1 wrong command line, 2 wrong input (nothing is written), "
+    program.footer("Exit status: 0 done, 1 wrong command line, 2 wrong input (nothing of it is written), "
                    "3 an output could not be written.\n"
                    "kareport COMMAND --help tells more about a command.");
 

@@ -27,9 +27,9 @@ def run(surroundings):
         ], folder, surroundings.runs)
     return [Comparison(
         "report-file", f"{megabytes} MB of report text to a report file and back",
-        f"Report text of {megabytes} MB in UTF-8. kareport saves and loads inside a process that holds the report, and "
-        "changes every line end on the way; iconv reads and writes files. Copying the bytes of such a file is what the "
-        "machine itself needs.", results,
+        f"Report text of {megabytes} MB, all ASCII as nearly all of a report is. kareport saves and loads inside a process that "
+        "holds the report, and changes every line end on the way. iconv, as a whole process, reads and writes files: "
+        "its UTF-16 has twice the bytes.", results,
         [Limit("saving, of iconv", ratio(results, "kareport, saved", ["iconv to UTF-8"]), 0.5),
          Limit("loading, of iconv", ratio(results, "kareport, loaded", ["iconv to UTF-16"]), 0.5)],
         extra=[f"Saving: {share(results, 'kareport, saved')}"])]

@@ -52,8 +52,6 @@ def make_files(folder, rows):
 def commands(surroundings, folder):
     return [
         Command("kareport", [surroundings.kareport, "render", "points.json"], ours=True),
-        # It is there once kareport has run.
-        Command("copying the report's bytes alone", ["cp", "points.rep", "copy.rep"], bound=True),
         Command("mawk printf", ["mawk", "-F,", AWK, "points.csv"], f"{folder}/mawk.txt"),
         Command("gawk printf", ["gawk", "-F,", AWK, "points.csv"], f"{folder}/gawk.txt",
                 environment={"LC_ALL": "C"}),
@@ -84,5 +82,6 @@ def run(surroundings):
             f"rows-{rows}", f"{rows:,} rows to a report",
             f"{rows:,} rows of 6 columns (number, northing, easting, elevation, station, name) from CSV to an aligned text "
             "with fixed decimals. kareport writes a paged report file with a heading on every page; the others print "
-            "their lines without pages. The data is read, and all is written, in memory.", results, limits))
+            "their lines without pages; Miller finds the widths of the columns itself, and holds all rows for that. The data "
+            "is read, and all is written, in memory.", results, limits))
     return comparisons

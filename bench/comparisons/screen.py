@@ -33,13 +33,17 @@ class Screen:
         """The pixels of (x, y, width, height), four bytes each."""
         return self.root.get_image(*area, X.ZPixmap, 0xFFFFFFFF).data
 
-    def window(self, least=(300, 200)):
-        """Place and size of the topmost window that is large enough; nothing without one."""
+    def window(self, least=(300, 200), size=None):
+        """Place and size of the topmost window that is large enough; nothing without one. @param size  what it gets"""
         for child in reversed(self.root.query_tree().children):
             geometry = child.get_geometry()
             if child.get_attributes().map_state == X.IsViewable and geometry.width >= least[0] and \
                     geometry.height >= least[1]:
                 child.set_input_focus(X.RevertToParent, X.CurrentTime)
+                if size:
+                    child.configure(x=0, y=0, width=size[0], height=size[1])
+                    self.display.sync()
+                    return 0, 0, *size
                 return geometry.x, geometry.y, geometry.width, geometry.height
         return None
 

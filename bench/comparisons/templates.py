@@ -7,7 +7,7 @@ from work import Comparison, Limit, ratio
 def run(surroundings):
     runs = benchmarks(surroundings, "(loadTemplate|parsePugixml|parseLibxml2)/200$", max(surroundings.runs, 3))
     names = {"loadTemplate/200": "kareport", "parsePugixml/200": "pugixml", "parseLibxml2/200": "libxml2"}
-    results = [Result(shown, shown == "kareport", seconds(runs[name])) for name, shown in names.items()]
+    results = [Result(shown, shown == "kareport", seconds=seconds(runs[name])) for name, shown in names.items()]
     return [Comparison(
         "templates", "200 templates in 1 MB read",
         "A file of 200 templates, 1 MB: kareport opens it, looks for the last template and reads its tables, fields and "

@@ -62,8 +62,8 @@ def make(function, *arguments):
 def share(results, ours):
     """How much of our time is what the work takes at the least."""
     own = next(result.median for result in results if result.name == ours)
-    least = next(result.median for result in results if result.bound)
-    return f"{least / own:.0%} of our time is {next(result.name for result in results if result.bound)}."
+    bound = next(result for result in results if result.bound)
+    return f"{bound.median / own:.0%} of our time is {bound.name}." if own and bound.median else ""
 
 
 def ratio(results, ours, others=None):
