@@ -37,10 +37,11 @@ PARTS = [
 ]
 
 
-def benchmarks(surroundings, pattern, repetitions):
-    """The runs of each benchmark, by its name."""
+def benchmarks(surroundings, pattern, repetitions, mixed=True):
+    """The runs of each benchmark, by its name. @param mixed  in turn; otherwise all of one behind each other, for
+    benchmarks that leave their memory in a state that the others pay for"""
     command = [f"{surroundings.bench}/ka_bench", f"--benchmark_filter={pattern}", "--benchmark_format=json",
-               f"--benchmark_repetitions={repetitions}", "--benchmark_enable_random_interleaving=true"]
+               f"--benchmark_repetitions={repetitions}", f"--benchmark_enable_random_interleaving={str(mixed).lower()}"]
     environment = {**os.environ, "QT_QPA_PLATFORM": "offscreen"}
     answer = subprocess.run(command, env=environment, check=True, stdout=subprocess.PIPE, stderr=subprocess.DEVNULL)
     runs = {}
