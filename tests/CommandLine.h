@@ -20,6 +20,17 @@ struct ProgramRun
     QByteArray all() const { return "status " + QByteArray::number(status) + "\nout: " + out + "\nerr: " + err; }
 };
 
+/// What a program that was started did, when it has ended.
+inline ProgramRun endOf(QProcess &process)
+{
+    ProgramRun run;
+    const bool ended = process.waitForFinished(60'000);
+    run.status = ended && process.exitStatus() == QProcess::NormalExit ? process.exitCode() : -1;
+    run.out = process.readAllStandardOutput();
+    run.err = process.readAllStandardError();
+    return run;
+}
+
 /// Runs the program in a folder.
 inline ProgramRun runProgram(const QString &folder, const QStringList &arguments,
                              const std::initializer_list<std::pair<const char *, const char *>> &variables = {})
@@ -34,12 +45,7 @@ inline ProgramRun runProgram(const QString &folder, const QStringList &arguments
     process.setProcessEnvironment(environment);
     process.setWorkingDirectory(folder);
     process.start(QStringLiteral(KAREPORT_PROGRAM), arguments, QIODevice::ReadOnly);
-    const bool ended = process.waitForFinished(60'000);
-    ProgramRun run;
-    run.status = ended && process.exitStatus() == QProcess::NormalExit ? process.exitCode() : -1;
-    run.out = process.readAllStandardOutput();
-    run.err = process.readAllStandardError();
-    return run;
+    return endOf(process);
 }
 
 /// The words of a command line.

@@ -51,12 +51,7 @@ ProgramRun runWithInput(const QString &folder, const QStringList &arguments, con
     process.start(QStringLiteral(KAREPORT_PROGRAM), arguments);
     process.write(input);
     process.closeWriteChannel();
-    ProgramRun run;
-    const bool ended = process.waitForFinished(60'000);
-    run.status = ended && process.exitStatus() == QProcess::NormalExit ? process.exitCode() : -1;
-    run.out = process.readAllStandardOutput();
-    run.err = process.readAllStandardError();
-    return run;
+    return endOf(process);
 }
 
 TEST(CommandLineBatch, EveryJobIsMade)

@@ -17,12 +17,7 @@ ProgramRun runWithin(const QString &folder, const QStringList &arguments, rlim_t
         setrlimit(RLIMIT_AS, &limit);
     });
     process.start(QStringLiteral(KAREPORT_PROGRAM), arguments, QIODevice::ReadOnly);
-    ProgramRun run;
-    const bool ended = process.waitForFinished(60'000);
-    run.status = ended && process.exitStatus() == QProcess::NormalExit ? process.exitCode() : -1;
-    run.out = process.readAllStandardOutput();
-    run.err = process.readAllStandardError();
-    return run;
+    return endOf(process);
 }
 
 /// The program itself needs this much.

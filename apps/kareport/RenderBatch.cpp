@@ -32,7 +32,7 @@ QString fileOf(const Output &output)
 ExitStatus RenderBatch::run(const QStringList &jobs)
 {
     ExitStatus worst = exitDone;
-    for (qsizetype i = 0; i < jobs.size() && worst != exitInterrupted; ++i) {
+    for (qsizetype i = 0; i < jobs.size(); ++i) {
         if (isInterrupted()) {
             worst = exitInterrupted;
             break;

@@ -97,12 +97,12 @@ std::optional<ExitStatus> RenderJob::runIntoOutput(JobRunner &runner, const Outp
 {
     bool isOpen = false;
     bool isMade = false;
-    bool isLeftOut = false;
     bool isEmpty = false;
     std::optional<InputError> inputError;
+    const bool isReport = output.kind == OutputKind::Report; // an empty one makes no file
     const auto outputError = replaceOutput(output, [&](QIODevice &device) {
         isOpen = true;
-        ReportTextWriter writer(device, output.kind == OutputKind::Report ? LineEnds::ReportFile : LineEnds::PlainText);
+        ReportTextWriter writer(device, isReport ? LineEnds::ReportFile : LineEnds::PlainText);
         inputError = runner.run(&writer);
         if (inputError || isInterrupted()) {
             if (UReportDoc *report = runner.madeReport()) {
@@ -113,15 +113,14 @@ std::optional<ExitStatus> RenderJob::runIntoOutput(JobRunner &runner, const Outp
         isMade = true;
         const bool isWritten = runner.report().EndTextStream(writer);
         isEmpty = isWritten && writer.isEmpty();
-        isLeftOut = isEmpty && output.kind == OutputKind::Report; // an empty report makes no file
-        return isWritten && !isLeftOut;
+        return isWritten && !(isEmpty && isReport);
     });
     if (!isOpen) {
         return std::nullopt;
     }
     progress.finish();
     // What comes when the report is made is too late to stop it.
-    return isMade ? sayWritten(output, isLeftOut ? std::nullopt : outputError, isEmpty, command_.quiet)
+    return isMade ? sayWritten(output, isEmpty && isReport ? std::nullopt : outputError, isEmpty, command_.quiet)
                   : madeStatus(inputError);
 }
 
