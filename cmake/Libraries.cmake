@@ -2,7 +2,7 @@
 # that brings its own values, data, application and frame links its own library in the place of KaReportHost.
 
 set(KA_HOST_LAYERS ka_values ka_data ka_app ka_frame)
-set(KA_MODULE_LAYERS ka_templates ka_output ka_report ka_view ka_ui)
+set(KA_MODULE_LAYERS ka_templates ka_page ka_output ka_report ka_view ka_ui)
 
 function(ka_shared_library target)
     set(objects)

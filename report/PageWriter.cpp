@@ -2,6 +2,7 @@
 
 #include <QByteArrayView>
 
+#include <new>
 #include <type_traits>
 
 namespace kareport
@@ -41,6 +42,7 @@ PageWriter::PageWriter(PageWriterObserver *observer, ReportText::Reallocate real
 void PageWriter::clear()
 {
     text_.clear();
+    starts_.clear();
     hasLostText_ = false;
     lineCount_ = 0;
     heading_.text.clear();
@@ -51,6 +53,7 @@ bool PageWriter::emptyIntoOutlet()
 {
     const bool isTaken = text_.isNarrow() ? outlet_->write(text_.narrowView()) : outlet_->write(text_.view());
     text_.drain();
+    starts_.clear();
     return isTaken;
 }
 
@@ -106,10 +109,42 @@ void PageWriter::lineFeed(qint64 count)
     }
 }
 
+bool PageWriter::replace(qint64 at, qint64 removed, QStringView inserted)
+{
+    if (text_.owns(inserted)) {
+        return replace(at, removed, inserted.toString());
+    }
+    try {
+        const bool wantsRemoved = starts_.wantsRemoved(at, removed, inserted.size());
+        const QString removedText = wantsRemoved ? text_.piece(at, removed) : QString();
+        PageStarts::Edit edit = starts_.prepare(at, removed, removedText, inserted);
+        if (!text_.replace(at, removed, inserted)) {
+            return false;
+        }
+        starts_.carryOut(std::move(edit));
+    } catch (const std::bad_alloc &) {
+        return false;
+    }
+    return true;
+}
+
+void PageWriter::notePageStart()
+{
+    if (outlet_ != nullptr) {
+        return;
+    }
+    try {
+        starts_.add(text_.size());
+    } catch (const std::bad_alloc &) {
+        hasLostText_ = true; // the text is whole, its pages are not
+    }
+}
+
 void PageWriter::beginFirstPage()
 {
     pageNumber_ = 1;
     lineNumber_ = 1;
+    notePageStart();
     if (headerFlag_) {
         writeHeader();
     }
@@ -120,6 +155,7 @@ void PageWriter::breakPage()
     lineFeed(linesLeft() + 1);
     ++pageNumber_;
     lineNumber_ = 1;
+    notePageStart();
     if (headerFlag_) {
         writeHeader();
     }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "KaReportExport.h"
+#include "PageStarts.h"
 #include "ReportText.h"
 #include "ReportTextCodec.h"
 
@@ -51,6 +52,13 @@ public:
     void setOutlet(ReportTextWriter *outlet) { outlet_ = outlet; }
     /// Hands on what is left. @return whether all of the text was taken
     bool emptyIntoOutlet();
+
+    /// Where each page begins. A text that is handed on has no record: nobody can look at its pages.
+    const PageStarts &pageStarts() const { return starts_; }
+    void setPageStarts(std::vector<qint64> starts) { starts_.assign(std::move(starts)); }
+    /// Replaces a piece of the text and carries the page starts along.
+    /// @return false, changing nothing, for a piece that is not in the text or when there is no memory
+    bool replace(qint64 at, qint64 removed, QStringView inserted);
 
     /// Whether a part of what was to be written since the last `clear` is missing, for want of memory.
     bool hasLostText() const { return hasLostText_; }
@@ -109,6 +117,7 @@ private:
     template <typename View>
     void writeTextLine(View text, int linesBefore, int linesAfter, int style);
 
+    void notePageStart();
     void noteGrowth()
     {
         if (outlet_ != nullptr && text_.size() >= mostBeforeOutlet) {
@@ -118,6 +127,7 @@ private:
 
     PageWriterObserver *observer_;
     ReportText text_;
+    PageStarts starts_;
     ReportTextWriter *outlet_ = nullptr;
     bool hasLostText_ = false;
     int lineNumber_ = 0;

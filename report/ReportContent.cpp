@@ -1,5 +1,6 @@
 #include "ReportContent.h"
 
+#include "LineEndings.h"
 #include "UReportDoc.h"
 
 #include <QTextDocument>
@@ -36,6 +37,13 @@ QString shownText(const UReportDoc &report)
     QString text;
     report.GetRTFData(text);
     return text;
+}
+
+QString shownPlainText(const UReportDoc &report)
+{
+    QTextDocument document;
+    showReportContent(report, document);
+    return withCrLf(document.toPlainText());
 }
 
 std::optional<RichTextError> readShownRichText(const UReportDoc &report, const QString &text, QTextDocument &document,

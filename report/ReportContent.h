@@ -21,6 +21,9 @@ KAREPORT_EXPORT QFont reportFont(const UReportDoc &report);
 /// The text that a view shows of a report: its rich text in rich-text mode, else its own.
 KAREPORT_EXPORT QString shownText(const UReportDoc &report);
 
+/// The characters that a view shows of a report, its lines ended by CR LF: of rich text those of the document.
+KAREPORT_EXPORT QString shownPlainText(const UReportDoc &report);
+
 /// Reads the shown text of a report that is rich text into a document. What was loaded from a file is read as the bytes that
 /// it is.
 /// @param text  as `shownText` gives it; it begins as rich text does

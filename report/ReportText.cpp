@@ -189,6 +189,46 @@ bool ReportText::replace(qint64 at, qint64 removed, QStringView inserted)
     return replaceNow(at, removed, inserted);
 }
 
+QString ReportText::piece(qint64 at, qint64 length) const
+{
+    QString copy;
+    if (at < 0 || length <= 0 || at > size() || length > size() - at) {
+        return copy;
+    }
+    copy.reserve(length);
+    const qint64 end = at + length;
+    const auto addKept = [&](qint64 from, qint64 to) {
+        if (isNarrow_) {
+            copy += QLatin1StringView(reinterpret_cast<const char *>(narrow_.data()) + from, to - from);
+        } else {
+            copy += QStringView(wide_.data() + from, to - from);
+        }
+    };
+    // The text is what is kept, up to each edit that has not been carried out, and what that edit has inserted.
+    qint64 kept = 0;
+    qint64 place = 0;
+    const auto addPart = [&](qint64 partLength, auto add) {
+        const qint64 from = std::max(at, place);
+        const qint64 to = std::min(end, place + partLength);
+        if (from < to) {
+            add(from - place, to - place);
+        }
+        place += partLength;
+    };
+    const auto addKeptUpTo = [&](qint64 stop) {
+        addPart(stop - kept, [&](qint64 from, qint64 to) { addKept(kept + from, kept + to); });
+        kept = stop;
+    };
+    for (const PendingEdits::Edit &edit : pending_.edits()) {
+        addKeptUpTo(edit.at);
+        addPart(edit.inserted.size(),
+                [&](qint64 from, qint64 to) { copy += QStringView(edit.inserted).sliced(from, to - from); });
+        kept = edit.at + edit.removed;
+    }
+    addKeptUpTo(size() - pending_.growth());
+    return copy;
+}
+
 void ReportText::drain()
 {
     pending_.clear();

@@ -59,6 +59,8 @@ public:
     /// text together, when it is next read.
     /// @return false, changing nothing, for a piece that is not in the text or when there is no room
     bool replace(qint64 at, qint64 removed, QStringView inserted);
+    /// A copy of a piece of the text, in a time that does not grow with the text. Empty for a piece that is not in it.
+    QString piece(qint64 at, qint64 length) const;
     /// Empties the text and goes back to one block.
     void clear();
     /// Empties the text and keeps its memory, for what is written next.

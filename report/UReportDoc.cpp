@@ -57,9 +57,11 @@ bool UReportDoc::IsReportAvailable(const UReportDoc *report)
 void UReportDoc::SetData(const QString &text)
 {
     ++editCount_;
+    page_.setPageStarts({});
     if (!page_.text().assign(text)) {
         page_.noteLostText();
     }
+    FindPageStarts();
 }
 
 void UReportDoc::Clear()

@@ -3,6 +3,7 @@
 #include "KaReportExport.h"
 #include "PageMeasurement.h"
 #include "PageWriter.h"
+#include "ReportPages.h"
 #include "ReportTextCodec.h"
 #include "RichTextImage.h"
 #include "UDataObjectList.h"
@@ -73,9 +74,11 @@ public:
     /// @return false when there is no measured page or no font, a write fails, or the work was stopped
     bool WritePdf(QIODevice &device, kareport::PdfNotes *notes = nullptr,
                   const std::function<bool(qint64, qint64)> &progress = {}) const;
-    /// Replaces the text as it is. Counters stay, so what is written next continues the old pages.
+    /// Replaces the text as it is. Counters stay, so what is written next continues the old pages. Where its pages begin is
+    /// found by its page headers.
     void SetData(const QString &text);
-    /// Replaces a piece of the text as it is, in a time that does not grow with the text. Counters stay.
+    /// Replaces a piece of the text as it is, in a time that does not grow with the text. Counters stay; pages begin where
+    /// they did before.
     /// @param at  the first character replaced, from 0
     /// @return false, changing nothing, for a piece that is not in the text or when there is no memory
     bool ReplaceText(qint64 at, qint64 removed, QStringView inserted);
@@ -138,6 +141,24 @@ public:
     /// Fixes the lines of a page or the characters of a row (1 or more), whatever is measured; with both, no font is
     /// measured. What is not given is measured again by the next `SetPageSize`.
     void FixPage(std::optional<int> linesPerPage, std::optional<int> charsPerRow);
+    /// Whether the lines of a page were given by `FixPage`, and are not measured.
+    bool IsPageFixed() const { return fixedLinesPerPage_.has_value(); }
+
+    /// Whether the text is the source of a rich-text document, which is shown in its place.
+    bool HoldsRichTextSource() const;
+    /// The pages of the report, for all that shows, prints or saves them. Of a report that holds the source of a rich-text
+    /// document they are those of the text that is shown, as `kareport::shownPlainText` gives it.
+    std::vector<kareport::ReportPage> GetPages() const;
+    /// Where pages begin, as the writer recorded it: the places of characters in the text, from 0, in ascending order. A
+    /// place that does not stand at the beginning of a line counts for nothing.
+    const std::vector<qint64> &GetPageStarts() const { return page_.pageStarts().positions(); }
+    void SetPageStarts(std::vector<qint64> starts) { page_.setPageStarts(std::move(starts)); }
+    /// Takes the page headers in the text from a place on for the page starts there. Nothing where there is none.
+    /// @return whether there was one
+    bool FindPageStarts(qint64 from = 0);
+    /// The lines, from 0, that pages begin with; text before the first of them has pages by counting lines.
+    std::vector<qint64> GetPageStartLines() const;
+
     int GetLinesPerPage() const { return page_.linesPerPage(); }
     int GetCharsPerRow() const { return geometry_.charsPerRow; }
     int GetLineCount() const { return page_.lineCount(); }               ///< 0: nothing has been written yet

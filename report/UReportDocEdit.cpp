@@ -2,7 +2,7 @@
 
 bool UReportDoc::ReplaceText(qint64 at, qint64 removed, QStringView inserted)
 {
-    if (!page_.text().replace(at, removed, inserted)) {
+    if (!page_.replace(at, removed, inserted)) {
         return false;
     }
     if (removed > 0 || !inserted.isEmpty()) {

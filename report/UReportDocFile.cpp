@@ -17,7 +17,6 @@
 #include "Xlate.h"
 
 #include <QBuffer>
-#include <QTextDocument>
 
 #include <algorithm>
 
@@ -156,13 +155,9 @@ bool UReportDoc::WritePdf(QIODevice &device, kareport::PdfNotes *notes,
     options.lineCount = GetLineCount();
     options.progress = progress;
     const kareport::ReportText &text = page_.text();
-    const bool isSource =
-        text.isNarrow() ? kareport::isRichText(QByteArrayView(text.narrowView())) : kareport::isRichText(text.view());
-    if (openedFromRtf_ && !GetRTFDataFlag() && isSource) {
+    if (HoldsRichTextSource()) {
         // The text of the document, not its source.
-        QTextDocument document;
-        kareport::showReportContent(*this, document);
-        const QString shown = kareport::withCrLf(document.toPlainText());
+        const QString shown = kareport::shownPlainText(*this);
         options.lineCount = static_cast<int>(shown.count(u'\n')) + 1;
         return kareport::writePdf(device, QStringView(shown), options, notes);
     }

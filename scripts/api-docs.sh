@@ -11,7 +11,7 @@ mkdir -p out/api
     printf 'INPUT ='
     sed -n '/ HEADERS/,/PRIVATE_HEADERS\|SOURCES/p' {host/*,templates,output,report,view,ui}/CMakeLists.txt |
         tr ' ' '\n' | grep '\.h$' | sort -u |
-        while read -r header; do find host templates output report view ui -name "$header" -printf ' %p'; done
+        while read -r header; do find host templates page output report view ui -name "$header" -printf ' %p'; done
     echo
 } > out/api/Doxyfile
 doxygen -q out/api/Doxyfile

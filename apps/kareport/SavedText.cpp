@@ -1,6 +1,5 @@
 #include "SavedText.h"
 
-#include "Language.h"
 #include "PageHeader.h"
 #include "UReportDoc.h"
 
@@ -9,12 +8,7 @@ namespace kareport
 
 std::optional<int> linesOfPages(QStringView text)
 {
-    for (const QString &label : inAllLanguages("   Page:@@Report Header")) {
-        if (const auto lines = linesBetweenPageHeaders(text, label)) {
-            return lines;
-        }
-    }
-    return std::nullopt;
+    return linesBetweenPageHeaders(text);
 }
 
 void writeLines(UReportDoc &report, QStringView text)

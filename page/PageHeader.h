@@ -3,10 +3,12 @@
 #include "KaReportExport.h"
 
 #include <QDateTime>
+#include <QLatin1StringView>
 #include <QString>
 #include <QStringView>
 
 #include <optional>
+#include <vector>
 
 namespace kareport
 {
@@ -20,8 +22,16 @@ KAREPORT_EXPORT QString pageHeaderLine(const QString &application, const QString
 /// A date and time such as "Mar 05, 2024  02:07PM", in English on every machine.
 KAREPORT_EXPORT QString pageHeaderDate(const QDateTime &time);
 
-/// The lines of a page of a report, as its first two header lines tell: the number of lines from the one to the other.
-/// Nothing when the text does not begin with the header of page 1 or has no second page.
-KAREPORT_EXPORT std::optional<int> linesBetweenPageHeaders(QStringView text, QStringView pageLabel);
+/// Whether a line, without its line end, is a page header, in whatever language it was written: it ends with the date, the
+/// label of the page number and the number.
+KAREPORT_EXPORT bool isPageHeader(QStringView line);
+
+/// Where the lines of a text begin that are page headers.
+KAREPORT_EXPORT std::vector<qint64> pageHeadersIn(QStringView text);
+KAREPORT_EXPORT std::vector<qint64> pageHeadersIn(QLatin1StringView text);
+
+/// The lines of a page of a report, as its header lines tell: the number of lines that stands most often from one of them
+/// to the next. Nothing for a text with fewer than two.
+KAREPORT_EXPORT std::optional<int> linesBetweenPageHeaders(QStringView text);
 
 } // namespace kareport
