@@ -129,12 +129,13 @@ std::vector<DictionaryElement> readDictionaryElements(const ScanText &body, Scan
         const ScanElement variables = GetNode(rest, u"VARIABLELIST", notes);
         NodeSequence variableSequence(variables.value, u"VARIABLE", notes);
         while (auto variable = variableSequence.next()) {
-            ScanText parts = variable->value;
+            // Looked up, not cut out: a short closing tag takes nothing along.
+            const ScanText &parts = variable->value;
             VariableElement read;
-            read.element = std::move(*variable);
-            read.id = ExtractNode(parts, u"ID", true, notes);
-            read.variableName = ExtractNode(parts, u"VARIABLENAME", true, notes);
+            read.id = GetNode(parts, u"ID", notes);
+            read.variableName = GetNode(parts, u"VARIABLENAME", notes);
             read.type = GetNode(parts, u"TYPE", notes);
+            read.element = std::move(*variable);
             dictionary.variables.push_back(std::move(read));
         }
         dictionaries.push_back(std::move(dictionary));

@@ -99,6 +99,38 @@ TEST(UXmlReportTplRecords, TableAndBlockFieldsAreCutInDifferentOrders)
     EXPECT_EQ(block.Width, 0) << "<Format>1</ went with the name";
 }
 
+TEST(UXmlReportTplRecords, AVariablesPartsAreLookedUpAndNotCutOut)
+{
+    // Were a part cut out, its short closing tag would take the beginning of the next one along.
+    struct Row
+    {
+        const char *variable;
+        const char *shown;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {"<ID>1</><VariableName>A</><Type>TEXT</>", "A:1:2", "each closed by the short form, nothing in between"},
+        {"<Type>TEXT</><VariableName>A</><ID>1</>", "A:1:2", "in any order"},
+        {"<ID>1</><VariableName>A</VariableName><Type>TEXT</Type>", "A:1:2", "the short form alone in its element"},
+        {"<ID>1</>id<VariableName>A</>variablename<Type>TEXT</Type>", "A:1:2", "with what a cut would have dropped"},
+        {"<ID>1</ID><VariableName>A</VariableName><Type>TEXT</Type>", "A:1:2", "full closing tags"},
+        {"<VariableName><ID>1</ID>A</VariableName><Type>TEXT</Type>", "<ID>1</ID>A:1:2",
+         "a part inside another stays in it"},
+    };
+    for (const Row &row : rows) {
+        const LoadedTemplate loaded(
+            templateOf(element("Dictionaries", dictionary("D", {element("Variable", row.variable)}))));
+        ASSERT_TRUE(loaded.loaded) << row.reason;
+        const sXmlReportDictionary *read = loaded.tpl.GetDictionary(QStringLiteral("D"));
+        ASSERT_NE(read, nullptr) << row.reason;
+        ASSERT_EQ(read->Variables.size(), 1U) << row.reason;
+        const sXmlReportVariable &variable = read->Variables[0];
+        EXPECT_EQ(QStringLiteral("%1:%2:%3").arg(variable.VariableName).arg(variable.ID).arg(variable.Type),
+                  QString::fromUtf8(row.shown))
+            << row.reason;
+    }
+}
+
 TEST(UXmlReportTplRecords, KeepsTablesAndDictionariesWithoutContent)
 {
     const LoadedTemplate loaded(
