@@ -2,6 +2,7 @@
 
 #include <gtest/gtest.h>
 
+#include <array>
 #include <random>
 
 namespace
@@ -56,6 +57,62 @@ TEST(CsvObjectList, OfAHeaderAloneIsEmpty)
         EXPECT_EQ(file.list->GetAt(0), nullptr) << content;
         EXPECT_FALSE(file.list->error()) << content;
     }
+}
+
+TEST(CsvObjectList, NamesOfColumnsAreTakenWithoutBlanksAroundThem)
+{
+    struct Row
+    {
+        const char *header;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {"Number, Northing, Note, Count", "a blank behind each delimiter"},
+        {"Number ,Northing\t,Note  ,Count", "blanks and tabs before it"},
+        {"\" Number\",\"Northing \",Note,Count", "inside quotes"},
+        {"\xC2\xA0Number,Northing\xE2\x80\xAF,\xE2\x80\x87Note,Count", "blanks that do not break a line"},
+        {"\xEF\xBB\xBF\xEF\xBB\xBFNumber,Northing,Note,Count", "a second byte-order mark"},
+        {"Number,\xEF\xBB\xBFNorthing,Note\xE2\x80\x8B,\xE2\x81\xA0"
+         "Count",
+         "marks that nobody sees"},
+        {"Number,Northing,Note,Count ", "at the end of the line"},
+    };
+    for (const Row &row : rows) {
+        const CsvFile file(QByteArray(row.header) + "\r\n A , 12.5 , a b , 3 \r\n");
+        EXPECT_EQ(textOf(file.list->GetAt(0)), QStringLiteral(" A |12.5| a b |3"))
+            << row.reason << ": what stands in texts stays";
+        EXPECT_FALSE(file.list->error()) << row.reason;
+    }
+    const CsvFile unnamed("Number, ,Remark, Remark ,,\n1,2,3,4,5,6\n");
+    EXPECT_EQ(textOf(unnamed.list->GetAt(0)), QStringLiteral("1|-|-|-")) << "what nobody knows may stand twice";
+}
+
+TEST(CsvObjectList, AnEmptyCellLeavesWhatAnotherVariableOfItsIdentifierHasStored)
+{
+    // Two names of one identifier, as templates have them for a value that goes by two names.
+    const auto find = [](const QString &name) -> std::optional<kareport::ValueParser> {
+        if (name == u"Count") {
+            return kareport::ValueParser(VARIABLE_INTEGER, csv::countId, kareport::DataUnits());
+        }
+        return kareport::ValueParser(VARIABLE_NUMBER, numberId, kareport::DataUnits());
+    };
+    JobFolder folder;
+    QByteArray content = "Number,Point,Count\n";
+    for (int i = 0; i < 3 * static_cast<int>(kareport::RowBatch::most); ++i) {
+        // Batches are filled again: a row of empty cells must not show what an earlier one had.
+        content += std::array<const char *, 4>{"A,,1\n", ",B,2\n", ",,\n", "A,B,4\n"}[static_cast<std::size_t>(i) % 4];
+    }
+    folder.put("points.csv", content);
+    auto opened = kareport::FileBytes::open(folder.path("points.csv"));
+    kareport::CsvObjectList list(std::get<std::shared_ptr<const kareport::FileBytes>>(opened), ',', find, {});
+    const QString expected[] = {QStringLiteral("A|-|-|1"), QStringLiteral("B|-|-|2"), QStringLiteral("-|-|-|-"),
+                                QStringLiteral("B|-|-|4")};
+    for (std::size_t i = 0; i < 3 * kareport::RowBatch::most; ++i) {
+        ASSERT_EQ(textOf(list.GetAt(i)), expected[i % 4]) << i;
+    }
+    list.Sort({numberId});
+    EXPECT_EQ(textOf(list.GetAt(0)), expected[2]) << "no value comes first";
+    EXPECT_EQ(textOf(list.GetAt(kareport::RowBatch::most)), expected[0]) << "sorted by what the row shows";
 }
 
 TEST(CsvObjectList, ReadsALongFileInTurn)
@@ -149,8 +206,12 @@ TEST(CsvObjectList, EveryMistakeHasItsPlace)
         {"", "1:1", "header row", "an empty file"},
         {"\n\n", "1:1", "header row", "blank lines only"},
         {"Number,\"Note\n1,2\n", "1:8", "no closing quote", "a header row that does not end"},
-        {"Number,Note,Number\n", "1:13", "\"Number\"", "a column twice"},
-        {"Number,Note,NUMBER\n1,2,3\n", "1:13", "\"NUMBER\"", "a column twice but for case"},
+        {"Number,Note,Number\n", "1:13", "the columns 1 and 3 are both named \"Number\"", "a column twice"},
+        {"Number,Note,NUMBER\n1,2,3\n", "1:13", "the columns 1 and 3 are both named \"NUMBER\"",
+         "a column twice but for case"},
+        {"Note, Number ,Number\n", "1:15", "the columns 2 and 3 are both named \"Number\"", "but for blanks"},
+        {"Number,\"\xC2\xA0Number\"\n", "1:8", "the columns 1 and 2 are both named \"Number\"",
+         "but for a blank in quotes"},
         {"Code;Northing\n1;2\n", "1:1", "no column", "nothing that the dictionary knows: most often another delimiter"},
         {"Number,Note\n1,a\n1,a,b\n", "3:5", "3 cells", "a cell too many"},
         {"Number,Note\n1,a\n1,\n1,a,\n", "4:5", "2 were expected", "an empty cell too many"},

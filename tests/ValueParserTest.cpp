@@ -132,7 +132,7 @@ TEST(ValueParser, BooleansAndFlagsTakeTheirWordsInAnyCase)
     }
 }
 
-TEST(ValueParser, AnEmptyCellStoresNoEntryAndTakesAnEarlierOneAway)
+TEST(ValueParser, AnEmptyCellStoresNothingAndTakesNothingAway)
 {
     for (int type = -1; type <= 22; ++type) {
         const ValueParser parser(type, id, DataUnits());
@@ -140,7 +140,10 @@ TEST(ValueParser, AnEmptyCellStoresNoEntryAndTakesAnEarlierOneAway)
         ASSERT_TRUE(parser.store("1", object)) << "type " << type;
         ASSERT_NE(object.Find(id), nullptr) << "type " << type;
         EXPECT_TRUE(parser.store("", object)) << "type " << type;
-        EXPECT_EQ(object.Find(id), nullptr) << "type " << type;
+        EXPECT_NE(object.Find(id), nullptr) << "type " << type << ": another variable of the identifier has stored it";
+        UDictionary empty;
+        EXPECT_TRUE(parser.store("", empty)) << "type " << type;
+        EXPECT_EQ(empty.Find(id), nullptr) << "type " << type;
     }
 }
 

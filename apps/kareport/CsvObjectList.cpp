@@ -26,6 +26,29 @@ QString quoteOf(std::string_view cell)
     return text.size() > qsizetype(longestQuote) ? text.left(longestQuote) + u'…' : text;
 }
 
+/// Blanks of any kind, and marks that nobody sees: programs leave them around the names of columns.
+bool isUnseen(QChar character)
+{
+    constexpr char16_t byteOrderMark = 0xFEFF;
+    constexpr char16_t zeroWidthSpace = 0x200B;
+    constexpr char16_t wordJoiner = 0x2060;
+    return character.isSpace() || character == byteOrderMark || character == zeroWidthSpace || character == wordJoiner;
+}
+
+/// The name of a column without what is around it.
+QString nameIn(std::string_view cell)
+{
+    const QString text = QString::fromUtf8(cell.data(), static_cast<qsizetype>(cell.size()));
+    QStringView name = text;
+    while (!name.isEmpty() && isUnseen(name.front())) {
+        name = name.sliced(1);
+    }
+    while (!name.isEmpty() && isUnseen(name.back())) {
+        name.chop(1);
+    }
+    return name.toString();
+}
+
 } // namespace
 
 CsvObjectList::CsvObjectList(std::shared_ptr<const FileBytes> file, char delimiter, const FindVariable &findVariable,
@@ -43,28 +66,46 @@ void CsvObjectList::readHeader(const FindVariable &findVariable)
                                  : reader_.errorAt(TextPlace(), Xlate("a header row of variable names was expected"));
         return;
     }
-    QHash<QString, bool> names; // and whether the dictionary knows them
+    QHash<QString, std::size_t> names;
     bool anyKnown = false;
     for (std::size_t i = 0; i < reader_.cells().size(); ++i) {
-        const std::string_view cell = reader_.cells()[i];
-        const QString name = QString::fromUtf8(cell.data(), static_cast<qsizetype>(cell.size()));
+        const QString name = nameIn(reader_.cells()[i]);
         const bool known = columns_.emplace_back(Column{name, findVariable(name)}).parser.has_value();
         anyKnown |= known;
         const auto earlier = names.constFind(foldedKey(name));
-        if (earlier != names.constEnd() && (known || *earlier)) {
+        if (earlier != names.constEnd() && (known || columns_[*earlier].parser)) {
             error_ =
                 reader_.errorAt(reader_.placeOfCell(i),
-                                Xlate("the column \"%1\" stands twice: each variable was expected once").arg(name));
+                                Xlate("the columns %1 and %2 are both named \"%3\": each variable was expected once")
+                                    .arg(QString::number(*earlier + 1), QString::number(i + 1), name));
             return;
         }
-        names.insert(foldedKey(name), known);
+        names.insert(foldedKey(name), i);
     }
+    noteSharedIds();
     if (!anyKnown) {
         error_ = reader_.errorAt(
             reader_.placeOfCell(0),
             Xlate("no column of the header row is a variable of the dictionary: a header row of variable "
                   "names, with the data's delimiter between them, was expected"));
     }
+}
+
+void CsvObjectList::noteSharedIds()
+{
+    std::vector<unsigned> ids;
+    for (const Column &column : columns_) {
+        if (!column.parser) {
+            continue;
+        }
+        const unsigned id = column.parser->id();
+        (std::find(ids.begin(), ids.end(), id) == ids.end() ? ids : sharedIds_).push_back(id);
+    }
+}
+
+bool CsvObjectList::isShared(unsigned id) const
+{
+    return std::find(sharedIds_.begin(), sharedIds_.end(), id) != sharedIds_.end();
 }
 
 UDataObject *CsvObjectList::GetAt(std::size_t index)
@@ -158,13 +199,22 @@ std::optional<InputError> CsvObjectList::storeCells(UDataObject &object, const s
                                    .arg(cells.size())
                                    .arg(columns_.size()));
     }
+    // The object may hold the values of an earlier row, which none of the cells has to replace.
+    for (const unsigned id : sharedIds_) {
+        object.Remove(id);
+    }
     for (std::size_t i = 0; i < cells.size(); ++i) {
         const auto &parser = columns_[i].parser;
         if (!parser ||
             (onlyIds != nullptr && std::find(onlyIds->begin(), onlyIds->end(), parser->id()) == onlyIds->end())) {
             continue;
         }
-        if (!parser->store(cells[i], object)) {
+        if (parser->isNone(cells[i])) {
+            // What another column has stored under the identifier stays.
+            if (!isShared(parser->id())) {
+                object.Remove(parser->id());
+            }
+        } else if (!parser->store(cells[i], object)) {
             return reader_.errorAt(reader_.placeOfCell(i),
                                    Xlate("the cell \"%1\" of the column \"%2\" does not fit: %3 was expected")
                                        .arg(quoteOf(cells[i]), columns_[i].name, parser->expected()));

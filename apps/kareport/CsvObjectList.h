@@ -47,6 +47,8 @@ private:
     };
 
     void readHeader(const FindVariable &findVariable);
+    void noteSharedIds();
+    bool isShared(unsigned id) const;
     void rewind();
     void fill(RowBatch &batch);
     bool seekNext();
@@ -58,6 +60,7 @@ private:
     CsvReader reader_;
     ReadProgress progress_;
     std::vector<Column> columns_;
+    std::vector<unsigned> sharedIds_; ///< identifiers that several columns have
     RowPlace firstRow_{};
     std::optional<std::vector<RowPlace>> order_; ///< of a sorted list
     std::size_t nextOrdered_ = 0;                ///< the row of `order_` that is read next

@@ -17,9 +17,13 @@ namespace kareport
 namespace
 {
 
+bool isBlank(char character)
+{
+    return character == ' ' || character == '\t';
+}
+
 std::string_view trimmed(std::string_view text)
 {
-    const auto isBlank = [](char character) { return character == ' ' || character == '\t'; };
     while (!text.empty() && isBlank(text.front())) {
         text.remove_prefix(1);
     }
@@ -188,11 +192,15 @@ ValueParser::ValueParser(int type, unsigned id, const DataUnits &units)
     }
 }
 
-bool ValueParser::store(std::string_view text, UDictionary &object) const
+bool ValueParser::isNone(std::string_view text) const
 {
     const bool isText = form_ == Form::Text || form_ == Form::PointNumber;
-    if (text.empty() || (!isText && trimmed(text).empty())) {
-        object.Remove(id_);
+    return text.empty() || (!isText && isBlank(text.front()) && trimmed(text).empty());
+}
+
+bool ValueParser::store(std::string_view text, UDictionary &object) const
+{
+    if (isNone(text)) {
         return true;
     }
     double number = 0;

@@ -19,7 +19,10 @@ public:
 
     unsigned id() const { return id_; }
 
-    /// Stores the value of a UTF-8 text; an empty text stores none.
+    /// Whether a text stands for no value: an empty one, and blanks where a text is not what is wanted.
+    bool isNone(std::string_view text) const;
+    /// Stores the value of a UTF-8 text. One that stands for none leaves the object as it is: another variable may have
+    /// the same identifier.
     /// @return whether the text fits the type
     bool store(std::string_view text, UDictionary &object) const;
     /// Stores a number that is one already. @return whether it fits the type
