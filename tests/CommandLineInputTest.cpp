@@ -42,6 +42,12 @@ const Row rows[] = {
      "an unknown key"},
     {"job.json", with("\"table\": \"Points\"", "\"table\": \"Pts\""), "job.json:4:38: error: ", "Points",
      "a table that the template does not have"},
+    {"job.json", with("\"report\"", "\"header\": true, \"report\""),
+     "job.json:4:2: error: ", "the key \"header\" stands in line 1 already", "a key twice"},
+    {"job.json", with("points.csv", "points.csv\\u0000.gz"), "job.json:3:24: error: ", "without a character 0",
+     "a file name that the system would cut"},
+    {"job.json", with("\"report\"", "\"title\": " + QByteArray(100000, '[') + ", \"report\""),
+     "job.json:4:", "too deeply nested", "a job deeper than a stack"},
     {"points.csv", {}, "job.json:3:24: error: ", "points.csv", "a missing data file, where the job asks for it"},
     {"t.xml", {}, "job.json:2:23: error: ", "t.xml", "a missing template, where the job asks for it"},
     {"t.xml", as(""), "t.xml:1:1: error: ", "ReportTemplate", "an empty template"},
@@ -94,6 +100,31 @@ TEST(CommandLineInput, WhatIsWrongIsSaidInOneSentenceAndNothingIsWritten)
         EXPECT_EQ(folder.bytesOf("kept.rep"), "kept") << row.reason;
         EXPECT_EQ(folder.bytesOf("kept.txt"), "kept too") << row.reason;
     }
+}
+
+TEST(CommandLineInput, ASetKeyOfManyStepsIsAnErrorOfTheCommandLine)
+{
+    const CommandLineFolder folder;
+    const QString key = QStringList(50000, QStringLiteral("a")).join(u'.');
+    const ProgramRun run =
+        runProgram(folder.path(), {QStringLiteral("render"), QStringLiteral("job.json"), QStringLiteral("--set"),
+                                   key + QStringLiteral("=1"), QStringLiteral("-o"), QStringLiteral("-")});
+    EXPECT_EQ(run.status, 1) << run.all().constData();
+    EXPECT_EQ(run.out, "");
+    EXPECT_TRUE(run.err.contains("at most 100 were expected")) << run.err.constData();
+    EXPECT_EQ(run.err.count('\n'), 1);
+    EXPECT_LT(run.err.size(), 400);
+}
+
+TEST(CommandLineInput, BlanksAroundNamesOfColumnsLoseNoValue)
+{
+    const CommandLineFolder folder;
+    const ProgramRun plain = folder.run("render job.json -o -");
+    ASSERT_EQ(plain.status, 0) << plain.all().constData();
+    QByteArray points = folder.bytesOf("points.csv");
+    points.replace(0, points.indexOf('\n'), points.first(points.indexOf('\n')).replace(",", " ,\xC2\xA0"));
+    folder.put("points.csv", points);
+    EXPECT_EQ(folder.run("render job.json -o -").out, plain.out);
 }
 
 TEST(CommandLineInput, ATemplateOf200MegabytesIsRefusedAtOnce)

@@ -200,6 +200,8 @@ TEST(JobReaderError, OfSteps)
         {R"({"report": [{"line": "L", "before": @true}]})", "a whole number", "wrong type"},
         {R"({"report": [{"line": "L", "after": @null}]})", "a whole number", "null is no number"},
         {R"({"report": [{"line": "L", "style": @"bold"}]})", "a whole number", "wrong type"},
+        {R"({"report": [{"line": "L", "style": @2147483648}]})", "from -2147483648 to 2147483647", "beyond 32 bits"},
+        {R"({"report": [{"line": "L", "style": @-2147483649}]})", "from -2147483648 to 2147483647", "beyond 32 bits"},
         {R"({"report": [{"line": "L", @"data": "d"}]})", "\"data\"", "a line has no data"},
         {R"({"report": [{"lineFeed": @"1"}]})", "a whole number", "wrong type"},
         {R"({"report": [{"lineFeed": 1, @"style": 1}]})", "\"style\"", "unknown key"},
@@ -220,6 +222,18 @@ TEST(JobReaderError, OfSteps)
          "a table without a template"},
         {R"({"data": {"d": {"values": {}}}, "report": [@{"block": "B", "data": "d"}]})", "\"template\"",
          "a block without a template"},
+    };
+    expectErrors(rows);
+}
+
+TEST(JobReaderError, OfFileNamesThatTheSystemWouldCut)
+{
+    const char *const cut = "a file name without a character 0 was expected";
+    const Row rows[] = {
+        {R"({"report": [], "data": {"d": {"csv": @"p.csv\u0000.txt"}}})", cut, "a data file"},
+        {R"({"report": [], "template": {"file": @"t.xml\u0000", "name": "T"}})", cut, "a template, at its end"},
+        {R"({"report": [], "output": ["a.rep", @"b\u0000.rep"]})", cut, "an output"},
+        {R"({"report": [], "output": [{"file": @"\u0000b.rep", "as": "rep"}]})", cut, "an output with its kind"},
     };
     expectErrors(rows);
 }

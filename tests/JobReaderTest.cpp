@@ -139,6 +139,14 @@ TEST(JobReader, StepsTakeTheirNumbers)
     EXPECT_EQ(table.before * 100 + table.after * 10 + table.headingAfter, 678);
 }
 
+TEST(JobReader, AStyleIsAnyNumberOf32Bits)
+{
+    const Job job = jobOf(R"({"report": [{"line": "", "style": 2147483647}, {"line": "", "style": -2147483648}]})");
+    ASSERT_EQ(job.steps.size(), 2U);
+    EXPECT_EQ(std::get<Job::Line>(job.steps[0].action).style, 2147483647);
+    EXPECT_EQ(std::get<Job::Line>(job.steps[1].action).style, -2147483647 - 1);
+}
+
 TEST(JobReader, PathsAreRelativeToTheJobFile)
 {
     const QString elsewhere = QDir::rootPath() + QStringLiteral("other/p.csv");

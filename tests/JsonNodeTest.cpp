@@ -245,6 +245,57 @@ TEST(JsonSource, WhatIsSetIsATextWhereATextIsExpected)
     }
 }
 
+TEST(JsonSource, AKeyThatStandsTwiceIsAnErrorWithBothPlaces)
+{
+    const auto read =
+        JsonSource::fromBytes(job, "{\"report\": [],\n \"data\": {\"d\": {\"values\": {\"A\": 1,\n  \"A\": 2}}}}");
+    const InputError *error = errorOf(read);
+    ASSERT_NE(error, nullptr);
+    EXPECT_EQ(error->message(), QStringLiteral("job.json:3:3: error: the key \"A\" stands in line 2 already: each key "
+                                               "was expected once"));
+}
+
+TEST(JsonSource, DeepNestingIsAnError)
+{
+    for (const QByteArray &group : {QByteArray("["), QByteArray("{\"a\":")}) {
+        const auto read = JsonSource::fromBytes(job, "{\"report\":" + group.repeated(100000));
+        const InputError *error = errorOf(read);
+        ASSERT_NE(error, nullptr);
+        EXPECT_TRUE(error->text.contains(u"too deeply nested")) << error->text.toStdString();
+    }
+}
+
+TEST(JsonSource, WhatCannotBeSetIsSaidInASentence)
+{
+    struct Row
+    {
+        QString key;
+        QString text;
+        QString message;
+        const char *reason;
+    };
+    const QString most = QStringList(100, QStringLiteral("a")).join(u'.');
+    const QString deep = QStringList(50001, QStringLiteral("a")).join(u'.');
+    const Row rows[] = {
+        {most, QStringLiteral("1"), QString(), "as many steps as are allowed"},
+        {most + QStringLiteral(".a"), QStringLiteral("1"),
+         QStringLiteral("the key \"") + most.left(100) + QStringLiteral("…\" has 101 steps: at most 100 were expected"),
+         "one more"},
+        {deep, QStringLiteral("1"),
+         QStringLiteral("the key \"") + deep.left(100) +
+             QStringLiteral("…\" has 50001 steps: at most 100 were expected"),
+         "each step is a call: the stack would not hold them"},
+        {QStringLiteral("title"), QStringLiteral("[").repeated(50000), QString(), "no JSON: a text"},
+        {QStringLiteral("data"), QStringLiteral("{\"d\": {\"csv\": \"a\", \"csv\": \"b\"}}"),
+         QStringLiteral("the key \"csv\" stands twice in \"{\"d\": {\"csv\": \"a\", \"csv\": \"b\"}}\""),
+         "a key twice in a value"},
+    };
+    for (const Row &row : rows) {
+        JsonSource source = sourceOf(base);
+        EXPECT_EQ(source.set(row.key, row.text).value_or(QString()), row.message) << row.reason;
+    }
+}
+
 TEST(JsonSource, AnErrorInWhatIsSetNamesTheOption)
 {
     struct Row

@@ -95,7 +95,6 @@ TEST(JsonObjectList, StoresMembersByTheTypeOfTheVariable)
         {VARIABLE_DOUBLE, R"({"V": ""})", "none", "an empty text is no value"},
         {VARIABLE_DOUBLE, R"({})", "none", "no member"},
         {VARIABLE_DOUBLE, R"({"W": [1, {}], "X": {"V": 1}, "Y": true})", "none", "what the dictionary does not know"},
-        {VARIABLE_DOUBLE, R"({"V": 1, "V": 2})", "8 2", "of members of one name the last counts"},
     };
     for (const Row &row : rows) {
         const StoredObject stored(row.json, row.type);

@@ -83,6 +83,57 @@ TEST(JsonPlaces, FindsTheLastOfManyElements)
     EXPECT_EQ(placeText(placeInJson(json, path({qsizetype(10000), name("n")}))), QStringLiteral("10001:7"));
 }
 
+TEST(JsonPlaces, FindsAKeyThatStandsTwice)
+{
+    struct RepeatedRow
+    {
+        const char *json;
+        const char *expected; ///< key, place of the second one, line of the first
+        const char *reason;
+    };
+    constexpr RepeatedRow repeatedRows[] = {
+        {R"({"a": 1, "a": 2})", "a 1:10 1", "in the root"},
+        {"{\"a\": 1,\n \"b\": 2,\n \"a\": 3}", "a 3:2 1", "lines below"},
+        {"\xEF\xBB\xBF{\"a\": 1,\n \"a\": 3}", "a 2:2 1", "behind a byte-order mark"},
+        {R"({"x": {"y": {"a": 1, "a": 2}}})", "a 1:22 1", "in an object inside others"},
+        {R"({"x": [[{"b": 0}, {"a": 1, "a": 2}]]})", "a 1:28 1", "in an object of a list"},
+        {R"({"a": {"a": [{"a": 1}, {"a": 2}]}, "b": "a"})", "none", "in objects of their own"},
+        {R"({"a": "b", "b": "a", "c": ["a", "a"]})", "none", "texts are no keys"},
+        {R"({"a": 1, "A": 2})", "none", "case matters"},
+        {R"({"a": 1, "\u0061": 2})", "a 1:10 1", "the second one written with an escape"},
+        {R"({"\u0061": 1, "a": 2})", "a 1:15 1", "the first one written with an escape"},
+        {R"({"\"": 1, "\\": 2, "\"": 3})", "\" 1:20 1", "quotes and backslashes"},
+        {R"({"": 1, "": 2})", " 1:9 1", "a key without a character"},
+        {"{\"\xC3\xA4\": 1, \"\xC3\xA4\": 2}", "\xC3\xA4 1:10 1", "columns count characters"},
+        {R"({"b": 1, "a": 2, "a": 3, "b": 4})", "a 1:18 1", "the one that comes first is said"},
+        {R"({"a": 1, "a": 2, "a": 3})", "a 1:10 1", "three are two and one more"},
+        {R"({"a": {}, "b": [], "c": {"d": -1e5}, "e": null, "f": true})", "none", "nothing is wrong"},
+        {"{}", "none", "an empty object"},
+        {"[]", "none", "an empty list"},
+    };
+    for (const RepeatedRow &row : repeatedRows) {
+        const auto repeated = kareport::findRepeatedKey(row.json);
+        const QString found =
+            repeated
+                ? QStringLiteral("%1 %2 %3").arg(repeated->key, placeText(repeated->place)).arg(repeated->firstLine)
+                : QStringLiteral("none");
+        EXPECT_EQ(found, name(row.expected)) << row.reason;
+    }
+}
+
+TEST(JsonPlaces, FindsARepeatedKeyAmongMany)
+{
+    QByteArray json = "{";
+    for (int i = 0; i < 100000; ++i) {
+        json += "\"key" + QByteArray::number(i) + "\": {\"x\": " + QByteArray::number(i) + "},\n";
+    }
+    EXPECT_FALSE(kareport::findRepeatedKey(json + "\"other\": 0}"));
+    const auto repeated = kareport::findRepeatedKey(json + "\"key7\": 0}");
+    ASSERT_TRUE(repeated);
+    EXPECT_EQ(placeText(repeated->place), QStringLiteral("100001:1"));
+    EXPECT_EQ(repeated->firstLine, 8);
+}
+
 TEST(JsonPlaces, PlacesAByte)
 {
     struct ByteRow

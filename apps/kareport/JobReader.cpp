@@ -7,6 +7,8 @@
 #include <QFileInfo>
 #include <QStringList>
 
+#include <limits>
+
 namespace kareport
 {
 
@@ -107,6 +109,16 @@ Job::Options readOptions(const JsonNode &node)
     return options;
 }
 
+/// The system takes a file name for ended at a character 0, and would open another file.
+QString readFileName(const JsonNode &node)
+{
+    const QString name = node.text();
+    if (name.contains(QChar::Null)) {
+        node.fail(Xlate("a file name without a character 0 was expected"));
+    }
+    return name;
+}
+
 QHash<QString, Job::DataSet> readData(const JsonNode &node, const QDir &folder)
 {
     QHash<QString, Job::DataSet> sets;
@@ -126,7 +138,7 @@ QHash<QString, Job::DataSet> readData(const JsonNode &node, const QDir &folder)
         if (csv.exists() == values.exists()) {
             set.fail(Xlate("either \"csv\" or \"values\" was expected"));
         } else if (csv.exists()) {
-            read.csv = folder.filePath(csv.text());
+            read.csv = folder.filePath(readFileName(csv));
         } else if (!values.value().isArray() && !values.value().isObject()) {
             values.fail(Xlate("an object or a list of objects was expected"));
         }
@@ -150,6 +162,12 @@ int readLines(const JsonNode &node, int fallback)
     return node.whole(fallback, -mostLines, mostLines);
 }
 
+/// A line takes any style: one that rich text does not know stands in the plain text alone.
+int readStyle(const JsonNode &node)
+{
+    return node.whole(0, std::numeric_limits<int>::min(), std::numeric_limits<int>::max());
+}
+
 std::optional<Job::Step> readStep(const JsonNode &node)
 {
     if (!node.expectObject()) {
@@ -166,7 +184,7 @@ std::optional<Job::Step> readStep(const JsonNode &node)
     if (node["line"].exists()) {
         node.allowOnly({"line", "before", "after", "style"});
         return step("line",
-                    Job::Line{node["line"].text(), before, readLines(node["after"], 1), node["style"].whole(0, 0, 3)});
+                    Job::Line{node["line"].text(), before, readLines(node["after"], 1), readStyle(node["style"])});
     }
     if (node["lineFeed"].exists()) {
         node.allowOnly({"lineFeed"});
@@ -248,7 +266,7 @@ std::optional<Output> readOutput(const JsonNode &node, const QDir &folder, std::
         node.fail(Xlate("the key \"file\" was expected"));
         return std::nullopt;
     }
-    const QString name = file.text();
+    const QString name = readFileName(file);
     const JsonNode as = node["as"];
     const auto kind = as.exists() ? outputKindFromName(as.text()) : outputKindOf(name, otherwise);
     if (!kind && as.exists()) {
@@ -302,7 +320,7 @@ Job readJob(JsonSource &source, std::optional<OutputKind> kindOtherwise, const J
                 node.fail(Xlate("the key \"%1\" with a text was expected").arg(QLatin1StringView(key)));
             }
         }
-        job.reportTemplate = Job::Template{node["file"].text(), node["name"].text()};
+        job.reportTemplate = Job::Template{readFileName(node["file"]), node["name"].text()};
     }
     job.options = readOptions(root["options"]);
     job.data = readData(root["data"], folder);

@@ -10,6 +10,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <variant>
 
 namespace kareport
 {
@@ -33,12 +34,29 @@ QString withDots(const JsonPath &path)
     return steps.join(u'.');
 }
 
-QJsonValue parsedOrText(const QString &text)
+/// A longer key leads nowhere in a job, and each step costs a call.
+constexpr qsizetype mostSteps = 100;
+/// What a message shows of a text from the command line.
+constexpr qsizetype longestQuote = 100;
+
+QString quoteOf(const QString &text)
+{
+    return text.size() > longestQuote ? text.left(longestQuote) + u'…' : text;
+}
+
+/// A value from the command line: JSON where it is some, else the text itself. @return what is wrong with it
+std::variant<QJsonValue, QString> parsedOrText(const QString &text)
 {
     QJsonParseError error{};
-    const auto document = QJsonDocument::fromJson('[' + text.toUtf8() + ']', &error);
-    return error.error == QJsonParseError::NoError && document.array().size() == 1 ? document.array().first()
-                                                                                   : QJsonValue(text);
+    const QByteArray json = '[' + text.toUtf8() + ']';
+    const auto document = QJsonDocument::fromJson(json, &error);
+    if (error.error != QJsonParseError::NoError || document.array().size() != 1) {
+        return QJsonValue(text);
+    }
+    if (const auto repeated = findRepeatedKey(json)) {
+        return Xlate("the key \"%1\" stands twice in \"%2\"").arg(quoteOf(repeated->key), quoteOf(text));
+    }
+    return document.array().first();
 }
 
 /// The value with another one where the steps lead; nothing when they lead nowhere.
@@ -103,6 +121,11 @@ Expected<JsonSource> JsonSource::fromBytes(const QString &path, const QByteArray
     if (!document.isObject()) {
         return InputError{path, TextPlace(), Xlate("a JSON object was expected")};
     }
+    if (const auto repeated = findRepeatedKey(bytes)) {
+        return InputError{path, repeated->place,
+                          Xlate("the key \"%1\" stands in line %2 already: each key was expected once")
+                              .arg(quoteOf(repeated->key), QString::number(repeated->firstLine))};
+    }
     JsonSource source;
     source.path_ = path;
     source.bytes_ = bytes;
@@ -120,9 +143,18 @@ JsonSource JsonSource::fromObject(const QJsonObject &object)
 std::optional<QString> JsonSource::set(const QString &key, const QString &text)
 {
     const QStringList steps = key.split(u'.');
-    const auto changed = steps.contains(QString()) ? std::nullopt : withValueAt(root_, steps, parsedOrText(text));
+    if (steps.size() > mostSteps) {
+        return Xlate("the key \"%1\" has %2 steps: at most %3 were expected")
+            .arg(quoteOf(key), QString::number(steps.size()), QString::number(mostSteps));
+    }
+    const auto value = parsedOrText(text);
+    if (const auto *wrong = std::get_if<QString>(&value)) {
+        return *wrong;
+    }
+    const auto changed =
+        steps.contains(QString()) ? std::nullopt : withValueAt(root_, steps, std::get<QJsonValue>(value));
     if (!changed) {
-        return Xlate("there is no place for the key \"%1\" in the job").arg(key);
+        return Xlate("there is no place for the key \"%1\" in the job").arg(quoteOf(key));
     }
     root_ = *changed;
     setTexts_.removeIf([inside = key + u'.'](const auto &given) { return given.key().startsWith(inside); });

@@ -4,6 +4,8 @@
 #include <QJsonDocument>
 
 #include <algorithm>
+#include <tuple>
+#include <utility>
 
 namespace kareport
 {
@@ -35,17 +37,24 @@ public:
         ++at_;
     }
 
-    QString takeString()
+    /// The bytes of a string, as they stand between its quotes.
+    QByteArrayView takeString()
     {
         peek();
-        const qsizetype begin = at_;
-        ++at_;
+        const qsizetype begin = ++at_;
         while (at_ < json_.size() && json_[at_] != '"') {
             at_ += json_[at_] == '\\' ? 2 : 1;
         }
+        const qsizetype end = std::min(at_, json_.size());
         ++at_;
-        const QByteArray literal = '[' + json_.mid(begin, at_ - begin) + ']';
-        return QJsonDocument::fromJson(literal).array().first().toString();
+        return QByteArrayView(json_).sliced(begin, end - begin);
+    }
+
+    void skipWord()
+    {
+        while (at_ < json_.size() && !QByteArrayView(",:]} \t\r\n").contains(json_[at_])) {
+            ++at_;
+        }
     }
 
     void skipValue()
@@ -67,9 +76,7 @@ public:
             } else if (next == ',' || next == ':') {
                 ++at_;
             } else {
-                while (at_ < json_.size() && !QByteArrayView(",:]} \t\r\n").contains(json_[at_])) {
-                    ++at_;
-                }
+                skipWord();
             }
         } while (depth > 0);
     }
@@ -78,6 +85,16 @@ private:
     const QByteArray &json_;
     qsizetype at_ = 0;
 };
+
+/// The text of a string's bytes.
+QString textOf(QByteArrayView bytes)
+{
+    if (!bytes.contains('\\')) {
+        return QString::fromUtf8(bytes);
+    }
+    const QByteArray literal = "[\"" + bytes.toByteArray() + "\"]";
+    return QJsonDocument::fromJson(literal).array().first().toString();
+}
 
 struct Found
 {
@@ -91,7 +108,7 @@ std::optional<Found> findMember(JsonWalker &walker, const QString &name)
     walker.take();
     while (walker.peek() == '"') {
         const qsizetype key = walker.at();
-        const bool matches = walker.takeString() == name;
+        const bool matches = textOf(walker.takeString()) == name;
         walker.peek();
         walker.take(); // the colon
         walker.peek();
@@ -121,7 +138,78 @@ std::optional<Found> findElement(JsonWalker &walker, qsizetype index)
     return std::nullopt;
 }
 
+struct Key
+{
+    QByteArray name;
+    qsizetype at;
+
+    bool operator<(const Key &other) const { return std::tie(name, at) < std::tie(other.name, other.at); }
+};
+
+/// The keys of an object, or those of none when a list is open.
+struct OpenGroup
+{
+    bool isObject = false;
+    std::vector<Key> keys;
+};
+
+/// The first key of an object that has been there before, and that one.
+std::optional<std::pair<Key, Key>> repeatedIn(std::vector<Key> &keys)
+{
+    std::sort(keys.begin(), keys.end());
+    std::optional<std::pair<Key, Key>> found;
+    for (std::size_t i = 1; i < keys.size(); ++i) {
+        if (keys[i].name == keys[i - 1].name && (!found || keys[i].at < found->second.at)) {
+            found = {keys[i - 1], keys[i]};
+        }
+    }
+    return found;
+}
+
+/// The name of a key: the bytes as they stand, unless escapes hide what they say.
+QByteArray nameOf(QByteArrayView bytes)
+{
+    return bytes.contains('\\') ? textOf(bytes).toUtf8() : QByteArray::fromRawData(bytes.data(), bytes.size());
+}
+
 } // namespace
+
+std::optional<RepeatedKey> findRepeatedKey(const QByteArray &json)
+{
+    JsonWalker walker(json);
+    std::vector<OpenGroup> groups; // used again at each depth: objects are many
+    std::size_t depth = 0;
+    bool isKeyNext = false;
+    for (char next = walker.peek(); next != '\0'; next = walker.peek()) {
+        const qsizetype at = walker.at();
+        if (next == '"') {
+            const QByteArrayView bytes = walker.takeString();
+            if (isKeyNext) {
+                groups[depth - 1].keys.push_back({nameOf(bytes), at});
+            }
+            isKeyNext = false;
+            continue;
+        }
+        if (next == '{' || next == '[') {
+            if (depth == groups.size()) {
+                groups.emplace_back();
+            }
+            groups[depth].isObject = next == '{';
+            groups[depth++].keys.clear();
+        } else if (next == '}' || next == ']') {
+            if (const auto repeated = repeatedIn(groups[--depth].keys)) {
+                return RepeatedKey{QString::fromUtf8(repeated->second.name), placeOfByte(json, repeated->second.at),
+                                   placeOfByte(json, repeated->first.at).line};
+            }
+        } else if (next != ',' && next != ':') {
+            walker.skipWord();
+            continue;
+        }
+        walker.take();
+        isKeyNext = (next == '{' || next == ',') && groups[depth - 1].isObject;
+    }
+    return std::nullopt;
+}
 
 TextPlace placeOfByte(const QByteArray &text, qsizetype byte)
 {
