@@ -20,6 +20,13 @@ report 'A test is not skipped without a reason behind it:' \
     "$(grep -nE 'GTEST_SKIP\(\);|DISABLED_' $sources || true)"
 report 'No shell is started:' \
     "$(grep -nE '\b(std::)?system\(|\bpopen\(' $sources | grep -v 'QLocale::system()' || true)"
+report 'Message boxes and labels are made in host/frame/PlainWidgets.cpp, as others take texts of files for HTML:' \
+    "$(grep -nE '\bQ(MessageBox|ErrorMessage|InputDialog)\b|new QLabel|\bQLabel( [a-z][A-Za-z]*)?[({]' $sources docs/*.md |
+        grep -vE '^(tests/|host/frame/PlainWidgets\.cpp:)' || true)"
+report 'A tool tip of an item, or at a place, goes through plainToolTip:' \
+    "$(grep -nE 'ToolTipRole|QToolTip::showText' $sources | grep -vE '^tests/|plainToolTip' || true)"
+report 'A progress dialog shows what it does in a label of its own that is plain (setLabel):' \
+    "$(grep -lE '\bQProgressDialog [a-z]|new QProgressDialog' $sources | xargs -r grep -L 'setLabel(plainLabel' || true)"
 report 'Every header guards itself:' \
     "$(for header in $(printf '%s\n' $sources | grep '\.h$'); do head -n 1 "$header" | grep -q '#pragma once' || echo "$header"; done)"
 exit $failed

@@ -255,4 +255,174 @@ TEST(Recovery, SpoiledFilesAreNoReports)
     }
 }
 
+/// Files of somebody else's, which nothing may happen to.
+class ForeignFiles
+{
+public:
+    ForeignFiles()
+    {
+        QDir(folder_.path()).mkdir(QStringLiteral("album"));
+        for (const char *name : {"1", "lock", "reports.json", "letter", "album/1"}) {
+            putFile(at(name), "mine");
+        }
+    }
+
+    QString path() const { return folder_.path(); }
+    QString at(const char *name) const { return folder_.filePath(QLatin1String(name)); }
+    void expectWhole(const char *reason) const
+    {
+        EXPECT_EQ(QDir(path()).entryList(QDir::AllEntries | QDir::NoDotAndDotDot).size(), 5) << reason;
+        for (const char *name : {"1", "lock", "reports.json", "letter", "album/1"}) {
+            EXPECT_EQ(contentOf(at(name)), "mine") << name << ": " << reason;
+        }
+    }
+
+private:
+    QTemporaryDir folder_;
+};
+
+const QString programName = QStringLiteral("0a1b2c3d-0000-4000-8000-00000000000");
+
+TEST(Recovery, LinksAreNotFollowedAndForeignFoldersAreNobodysBusiness)
+{
+    const CrashFolder folder;
+    const ForeignFiles foreign;
+    QDir().mkpath(folder.path() + QStringLiteral("/photos/2024"));
+    putFile(folder.path() + QStringLiteral("/photos/2024/1"), "mine");
+    putFile(folder.path() + QStringLiteral("/photos/1"), "mine");
+    QFile::link(foreign.path(), folder.path() + QStringLiteral("/link"));
+    QFile::link(foreign.path(), folder.path() + u'/' + programName + u'1');
+    // A folder of a program that crashed, with links among its files.
+    const QString crashed = folder.path() + u'/' + programName + u'2';
+    QDir().mkpath(crashed);
+    putFile(crashed + QStringLiteral("/reports.json"), R"([{"title": "T", "text": "1"}, {"title": "U", "text": "2"}])");
+    QFile::link(foreign.at("1"), crashed + QStringLiteral("/1"));
+    putFile(crashed + QStringLiteral("/2"), "text");
+    // One whose list is a link.
+    const QString linked = folder.path() + u'/' + programName + u'3';
+    QDir().mkpath(linked);
+    QFile::link(foreign.at("reports.json"), linked + QStringLiteral("/reports.json"));
+    putFile(linked + QStringLiteral("/1"), "text");
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    {
+        Recovery recovery(folder.path());
+        const std::vector<KeptReport> left = recovery.leftReports();
+        ASSERT_EQ(left.size(), 2U);
+        EXPECT_EQ(Recovery::reopen(left[0]), nullptr) << "its text is a link to somebody else's file";
+        EXPECT_NE(Recovery::reopen(left[1]), nullptr);
+        EXPECT_EQ(recovery.unreadableFolders(), QStringList{linked});
+        foreign.expectWhole("read");
+        recovery.keep();
+        recovery.discardLeft();
+    }
+    foreign.expectWhole("thrown away");
+    EXPECT_EQ(contentOf(folder.path() + QStringLiteral("/photos/2024/1")), "mine");
+    EXPECT_EQ(QDir(folder.path() + QStringLiteral("/photos")).entryList(QDir::AllEntries | QDir::NoDotAndDotDot),
+              QStringList({QStringLiteral("1"), QStringLiteral("2024")}))
+        << "not even a lock was put into it";
+    EXPECT_FALSE(QFile::exists(crashed)) << "the program's own folder has gone";
+    EXPECT_EQ(contentOf(linked + QStringLiteral("/1")), "text");
+}
+
+TEST(Recovery, OnlyWhatAProgramWroteIsRemoved)
+{
+    struct Row
+    {
+        QString folder;
+        const char *file;
+        bool stays;
+        const char *reason;
+    };
+    const Row rows[] = {
+        {programName + u'4', "1", false, "a text of the list"},
+        {programName + u'4', "7", false, "a text whose list was not written any more: its name says whose it is"},
+        {programName + u'4', "1.aB3dEf", false, "what was being written when the program was killed"},
+        {programName + u'4', "reports.json.aB3dEf", false, "the list, likewise"},
+        {programName + u'4', "letter", true, "no name of ours"},
+        {programName + u'4', "1.rep", true, "no name of ours"},
+        {programName + u'4', "-1", true, "no name of ours"},
+        {programName + u'4', "album/1", true, "a folder in the folder"},
+        {QStringLiteral("1 copy"), "1", false, "a folder that was renamed has a list"},
+        {QStringLiteral("1 copy"), "7", true, "there, what the list does not name may be anybody's"},
+    };
+    for (const Row &row : rows) {
+        const CrashFolder folder;
+        const QString crashed = folder.path() + u'/' + row.folder;
+        QDir().mkpath(crashed + QStringLiteral("/album"));
+        QDir().rmdir(crashed + (QByteArray(row.file).startsWith("album") ? QString() : QStringLiteral("/album")));
+        putFile(crashed + QStringLiteral("/reports.json"), R"([{"title": "T", "text": "1"}])");
+        const QString file = crashed + u'/' + QLatin1String(row.file);
+        putFile(file, "content");
+        Desk desk;
+        {
+            Recovery recovery(folder.path());
+            ASSERT_EQ(recovery.leftReports().size(), 1U) << row.reason;
+            recovery.discardLeft();
+        }
+        EXPECT_EQ(QFile::exists(file), row.stays) << row.file << ": " << row.reason;
+        EXPECT_EQ(QFile::exists(crashed), row.stays) << row.file << ": " << row.reason;
+        EXPECT_FALSE(QFile::exists(crashed + QStringLiteral("/reports.json"))) << row.file << ": " << row.reason;
+    }
+}
+
+TEST(Recovery, AFolderWhoseListCannotBeReadIsKeptAndSaid)
+{
+    struct Row
+    {
+        const char *list; ///< null for none
+        const char *text; ///< null for none
+        bool isSaid;
+        const char *reason;
+    };
+    for (const Row &row : {Row{"", "text", true, "an empty list"}, Row{"[{", "text", true, "a list that was cut off"},
+                           Row{"{}", "text", true, "no list"}, Row{nullptr, "text", true, "the list has gone"},
+                           Row{nullptr, nullptr, false, "the program ended before it had anything to keep"},
+                           Row{"[]", nullptr, false, "nothing was open"}})
+    {
+        const CrashFolder folder;
+        const QString crashed = folder.path() + u'/' + programName + u'5';
+        QDir().mkpath(crashed);
+        if (row.list != nullptr) {
+            putFile(crashed + QStringLiteral("/reports.json"), row.list);
+        }
+        if (row.text != nullptr) {
+            putFile(crashed + QStringLiteral("/1"), row.text);
+        }
+        {
+            Desk desk;
+            Recovery recovery(folder.path());
+            EXPECT_EQ(recovery.unreadableFolders(), row.isSaid ? QStringList{crashed} : QStringList()) << row.reason;
+            EXPECT_TRUE(recovery.leftReports().empty()) << row.reason;
+            recovery.discardLeft();
+        }
+        EXPECT_EQ(QFile::exists(crashed), row.isSaid) << row.reason;
+        EXPECT_EQ(QFile::exists(crashed + QStringLiteral("/1")), row.isSaid) << row.reason;
+    }
+}
+
+TEST(Recovery, ALinkInItsOwnFolderIsReplacedAndNotWrittenThrough)
+{
+    const CrashFolder folder;
+    const ForeignFiles foreign;
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    auto recovery = std::make_unique<Recovery>(folder.path());
+    const QString own = folder.path() + u'/' + folder.programs().value(0);
+    QFile::link(foreign.at("1"), own + QStringLiteral("/1"));
+    QFile::link(foreign.at("reports.json"), own + QStringLiteral("/reports.json"));
+    makeReport(QStringLiteral("R"), QStringLiteral("secret"));
+    EXPECT_TRUE(recovery->keep());
+    EXPECT_EQ(contentOf(own + QStringLiteral("/1")), "secret");
+    foreign.expectWhole("written");
+    // The folder is exchanged for a link while the program runs.
+    QDir().rename(own, own + u'x');
+    QFile::link(foreign.path(), own);
+    Desk::reports().front()->WriteLine(QStringLiteral("more"), 0, 1, 0);
+    EXPECT_FALSE(recovery->keep());
+    recovery.reset();
+    QFile::remove(own);
+    foreign.expectWhole("ended");
+}
+
 } // namespace

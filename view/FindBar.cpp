@@ -1,5 +1,6 @@
 #include "FindBar.h"
 
+#include "PlainWidgets.h"
 #include "ReportEdit.h"
 #include "Xlate.h"
 
@@ -42,7 +43,7 @@ FindBar::FindBar(ReportEdit &edit, QWidget *parent)
       next_(newButton(this, QStringLiteral("\u2193"), Xlate("Next match"), QStringLiteral("F3"))),
       matchCase_(new QCheckBox(Xlate("Match &case"), this)),
       wholeWord_(new QCheckBox(Xlate("Whole wor&d"), this)),
-      count_(new QLabel(this)),
+      count_(plainLabel(QString(), this)),
       close_(newButton(this, QStringLiteral("\u00D7"), Xlate("Close the find bar"), QStringLiteral("Esc"))),
       counter_([this] { showCount(); })
 {

@@ -1,5 +1,6 @@
 #include "PageBar.h"
 
+#include "PlainWidgets.h"
 #include "Xlate.h"
 
 #include <QHBoxLayout>
@@ -12,13 +13,17 @@ namespace kareport
 {
 
 PageBar::PageBar(std::function<void(int)> go, std::function<void()> leave, QWidget *parent)
-    : QWidget(parent), go_(std::move(go)), leave_(std::move(leave)), page_(new QSpinBox(this)), pages_(new QLabel(this))
+    : QWidget(parent),
+      go_(std::move(go)),
+      leave_(std::move(leave)),
+      page_(new QSpinBox(this)),
+      pages_(plainLabel(QString(), this))
 {
     setAccessibleName(Xlate("Go to page"));
     page_->setAccessibleName(Xlate("Page to go to"));
     page_->setMinimum(1);
     pages_->setAccessibleName(Xlate("Pages"));
-    auto *label = new QLabel(Xlate("&Go to page"), this);
+    auto *label = plainLabel(Xlate("&Go to page"), this);
     label->setBuddy(page_);
     auto *button = new QPushButton(Xlate("G&o"), this);
     button->setAccessibleName(Xlate("Go to page"));

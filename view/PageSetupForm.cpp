@@ -1,5 +1,6 @@
 #include "PageSetupForm.h"
 
+#include "PlainWidgets.h"
 #include "PrintGeometry.h"
 #include "Xlate.h"
 
@@ -41,15 +42,15 @@ PageSetupForm::PageSetupForm(const PageSetup &setup, QWidget *parent)
       printer_(new QComboBox),
       paper_(new QComboBox),
       paperRow_(new QWidget),
-      sheet_(new QLabel),
-      warning_(new QLabel)
+      sheet_(plainLabel()),
+      warning_(plainLabel())
 {
     auto *layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
     auto *printerRow = new QWidget;
     auto *printerLayout = new QHBoxLayout(printerRow);
     printerLayout->setContentsMargins(0, 0, 0, 0);
-    auto *printerLabel = new QLabel(Xlate("Pr&inter:"));
+    auto *printerLabel = plainLabel(Xlate("Pr&inter:"));
     printerLabel->setBuddy(printer_);
     printer_->setAccessibleName(Xlate("Printer"));
     printer_->addItems(setup.printers);
@@ -60,7 +61,7 @@ PageSetupForm::PageSetupForm(const PageSetup &setup, QWidget *parent)
     layout->addWidget(printerRow);
     auto *paperLayout = new QHBoxLayout(paperRow_);
     paperLayout->setContentsMargins(0, 0, 0, 0);
-    auto *paperLabel = new QLabel(Xlate("Pa&per:"));
+    auto *paperLabel = plainLabel(Xlate("Pa&per:"));
     paperLabel->setBuddy(paper_);
     paper_->setAccessibleName(Xlate("Paper"));
     paperLayout->addWidget(paperLabel);
@@ -92,7 +93,7 @@ PageSetupForm::PageSetupForm(const PageSetup &setup, QWidget *parent)
         field->setSuffix(Xlate(" mm"));
         field->setValue(double(inOrder(setup.margins).at(i)) / hundredths);
         field->setAccessibleName(names.at(i));
-        auto *label = new QLabel(labels.at(i));
+        auto *label = plainLabel(labels.at(i));
         label->setBuddy(field);
         marginsLayout->addWidget(label, places.at(i).first, columns * places.at(i).second);
         marginsLayout->addWidget(field, places.at(i).first, columns * places.at(i).second + 1);

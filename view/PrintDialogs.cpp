@@ -1,5 +1,6 @@
 #include "PrintDialogs.h"
 
+#include "PlainWidgets.h"
 #include "Xlate.h"
 
 #include <QPointer>
@@ -34,6 +35,7 @@ bool askPrint(QPrinter &printer, int maxPage, QWidget *parent)
     // The parent may go, and the dialog with it, while it is open.
     const QPointer<QPrintDialog> dialog = new QPrintDialog(&printer, parent);
     dialog->setWindowTitle(Xlate("Print"));
+    keepLabelsPlain(*dialog); // they show what printers say of themselves
     dialog->setOption(QAbstractPrintDialog::PrintPageRange);
     if (maxPage > 0) {
         dialog->setMinMax(1, maxPage);

@@ -1,8 +1,10 @@
 #include "PrintProgress.h"
 
+#include "PlainWidgets.h"
 #include "Xlate.h"
 
 #include <QCoreApplication>
+#include <QLabel>
 #include <QProgressDialog>
 
 #include <algorithm>
@@ -34,6 +36,7 @@ void PrintProgress::show()
     shown_ = true;
     dialog_ = new QProgressDialog(parent_);
     dialog_->setWindowTitle(Xlate("Printing"));
+    dialog_->setLabel(plainLabel());
     dialog_->setCancelButtonText(Xlate("Cancel"));
     dialog_->setWindowModality(Qt::ApplicationModal);
     dialog_->setAutoClose(false);

@@ -2,6 +2,7 @@
 
 #include "FindBar.h"
 #include "PageBar.h"
+#include "PlainWidgets.h"
 #include "ReportEdit.h"
 #include "Xlate.h"
 
@@ -25,7 +26,7 @@ constexpr int usualLinesPerPage = 72;
 
 QLabel *newLabel(QWidget *parent, const QString &name, const QString &widest)
 {
-    auto *label = new QLabel(parent);
+    auto *label = plainLabel(QString(), parent);
     label->setAccessibleName(name);
     // A label of one width is not laid out anew at every key.
     label->setMinimumWidth(label->fontMetrics().horizontalAdvance(widest));

@@ -1,6 +1,7 @@
 #include "DeskFrame.h"
 
 #include "DeskCommandIds.h"
+#include "PlainWidgets.h"
 #include "ReportResources.h"
 #include "UApplication.h"
 #include "Xlate.h"
@@ -102,9 +103,7 @@ void DeskFrame::fillRecentFiles()
     recentFiles_->setEnabled(!files.isEmpty());
     int number = 0;
     for (const QString &path : files) {
-        // An ampersand of a name is no key.
-        const QString name = QString(path).replace(u'&', QStringLiteral("&&"));
-        recentFiles_->addAction(QStringLiteral("&%1 %2").arg(++number % 10).arg(name), this,
+        recentFiles_->addAction(QStringLiteral("&%1 ").arg(++number % 10) + kareport::plainMenuText(path), this,
                                 [this, path] { OpenFile(path); });
     }
 }

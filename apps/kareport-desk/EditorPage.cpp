@@ -2,6 +2,7 @@
 
 #include "EditorKind.h"
 #include "InstalledEditors.h"
+#include "PlainWidgets.h"
 #include "Xlate.h"
 
 #include <QCheckBox>
@@ -22,7 +23,7 @@ EditorPage::EditorPage(bool usesEditor, const QString &editor, bool keepsReports
       editor_(new QComboBox),
       browse_(new QPushButton(Xlate("Bro&wse..."))),
       keeps_(new QCheckBox(Xlate("&Keep a report open while the program is"))),
-      kind_(new QLabel)
+      kind_(plainLabel())
 {
     keeps_->setChecked(keepsReports);
     uses_->setChecked(usesEditor);
@@ -31,7 +32,7 @@ EditorPage::EditorPage(bool usesEditor, const QString &editor, bool keepsReports
     editor_->setAccessibleName(Xlate("Program that shows reports"));
     for (const InstalledEditor &installed : installedEditors()) {
         editor_->addItem(installed.name, installed.path);
-        editor_->setItemData(editor_->count() - 1, installed.path, Qt::ToolTipRole);
+        editor_->setItemData(editor_->count() - 1, plainToolTip(installed.path), Qt::ToolTipRole);
     }
     editor_->setEditText(editor);
     kind_->setWordWrap(true);

@@ -1,6 +1,6 @@
 #include "Recovery.h"
 
-#include "ReplaceFile.h"
+#include "PdfFile.h"
 #include "ReportEntry.h"
 #include "SavedReports.h"
 #include "UReportDoc.h"
@@ -24,14 +24,7 @@ namespace kareport
 namespace
 {
 
-const QString lockName = QStringLiteral("lock");
-const QString listName = QStringLiteral("reports.json");
 constexpr QFileDevice::Permissions onlyUser = QFileDevice::ReadOwner | QFileDevice::WriteOwner | QFileDevice::ExeOwner;
-
-bool writeFile(const QString &path, const QByteArray &bytes)
-{
-    return replaceFile(path, [&bytes](QIODevice &device) { return device.write(bytes) == bytes.size(); });
-}
 
 /// The view whose formats are not in the report's text; null when there is none.
 const UReportView *formattedView(const UReportDoc &report)
@@ -45,17 +38,13 @@ const UReportView *formattedView(const UReportDoc &report)
     return nullptr;
 }
 
-std::vector<KeptReport> readList(const QString &folder)
+std::vector<KeptReport> readList(const RecoveryFolder &folder)
 {
     std::vector<KeptReport> reports;
-    QFile file(QDir(folder).filePath(listName));
-    if (!file.open(QIODevice::ReadOnly)) {
-        return reports;
-    }
-    for (const QJsonValue &entry : QJsonDocument::fromJson(file.readAll()).array()) {
+    for (const QJsonValue &entry : folder.list().value_or(QJsonArray())) {
         const QString text = entry[QStringLiteral("text")].toString();
         reports.push_back({entry[QStringLiteral("title")].toString(), entry[QStringLiteral("path")].toString(),
-                           text.isEmpty() ? text : QDir(folder).filePath(QFileInfo(text).fileName())});
+                           text.isEmpty() ? text : folder.textFile(text)});
     }
     return reports;
 }
@@ -81,40 +70,53 @@ Recovery::Recovery(const QString &folder)
     if (!all.mkpath(QStringLiteral("."))) {
         return;
     }
-    QFile::setPermissions(folder, onlyUser);
-    const auto makeLock = [&all](const QString &name) {
-        auto lock = std::make_unique<QLockFile>(all.filePath(name + u'/' + lockName));
-        lock->setStaleLockTime(0); // however long a program runs, its lock holds
-        return lock;
-    };
-    for (const QString &name : all.entryList(QDir::Dirs | QDir::NoDotAndDotDot, QDir::Time | QDir::Reversed)) {
-        auto lock = makeLock(name);
-        if (lock->tryLock(0)) {
-            left_.emplace_back(all.filePath(name), std::move(lock));
-        }
+    if (!QFileInfo(folder).isSymLink()) {
+        QFile::setPermissions(folder, onlyUser);
+    }
+    for (const QString &name :
+         all.entryList(QDir::Dirs | QDir::NoSymLinks | QDir::NoDotAndDotDot, QDir::Time | QDir::Reversed))
+    {
+        takeIfLeft(RecoveryFolder(all.filePath(name)));
     }
     const QString name = QUuid::createUuid().toString(QUuid::WithoutBraces);
     if (all.mkdir(name)) {
-        folder_ = all.filePath(name);
-        QFile::setPermissions(folder_, onlyUser);
-        lock_ = makeLock(name);
+        folder_.emplace(all.filePath(name));
+        QFile::setPermissions(folder_->path(), onlyUser);
+        lock_ = folder_->makeLock();
         lock_->tryLock(0);
     }
 }
 
 Recovery::~Recovery()
 {
-    if (lock_) {
+    if (lock_ && !folder_->isOurs()) {
+        // Something else has taken the folder's name meanwhile: unlocking would remove its lock.
+        static_cast<void>(lock_.release());
+    } else if (lock_) {
+        folder_->removeFiles();
         lock_->unlock();
-        QDir(folder_).removeRecursively();
+        folder_->removeIfEmpty();
+    }
+}
+
+void Recovery::takeIfLeft(const RecoveryFolder &folder)
+{
+    auto lock = folder.isOurs() ? folder.makeLock() : nullptr;
+    if (lock == nullptr || !lock->tryLock(0)) {
+        return;
+    }
+    if (folder.list() || folder.isUnused()) {
+        left_.push_back({folder, std::move(lock)});
+    } else {
+        unreadable_.append(folder.path());
     }
 }
 
 std::vector<KeptReport> Recovery::leftReports() const
 {
     std::vector<KeptReport> reports;
-    for (const auto &left : left_) {
-        for (KeptReport &kept : readList(left.first)) {
+    for (const Left &left : left_) {
+        for (KeptReport &kept : readList(left.folder)) {
             reports.push_back(std::move(kept));
         }
     }
@@ -123,9 +125,10 @@ std::vector<KeptReport> Recovery::leftReports() const
 
 void Recovery::discardLeft()
 {
-    for (const auto &[folder, lock] : left_) {
-        lock->unlock();
-        QDir(folder).removeRecursively();
+    for (const Left &left : left_) {
+        left.folder.removeFiles();
+        left.lock->unlock();
+        left.folder.removeIfEmpty();
     }
     left_.clear();
 }
@@ -133,16 +136,16 @@ void Recovery::discardLeft()
 UReportDoc *Recovery::reopen(const KeptReport &kept)
 {
     if (kept.textFile.isEmpty()) {
-        return QFile::exists(kept.path) ? openSavedReport(kept.path) : nullptr;
+        return openSavedReport(kept.path);
     }
     QFile file(kept.textFile);
-    if (!file.open(QIODevice::ReadOnly)) {
+    if (!RecoveryFolder(QFileInfo(kept.textFile).path()).holdsText(kept.textFile) || !file.open(QIODevice::ReadOnly)) {
         return nullptr;
     }
     UReportDoc *report = CreateReport(kept.title, true, false, nullptr, 0, nullptr);
     if (report != nullptr) {
         report->SetData(QString::fromUtf8(file.readAll()));
-        if (!kept.path.isEmpty()) {
+        if (!kept.path.isEmpty() && !isPdfName(kept.path)) {
             report->SetPathName(kept.path, false);
         }
         report->UpdateAllViews(nullptr, 0, nullptr);
@@ -163,7 +166,7 @@ QString Recovery::textFileOf(const UReportDoc &report)
         written.file = QString::number(++lastNumber_);
     }
     const UReportView *view = formattedView(report);
-    const bool isWritten = replaceFile(QDir(folder_).filePath(written.file), [&report, view](QIODevice &device) {
+    const bool isWritten = folder_->write(written.file, [&report, view](QIODevice &device) {
         if (view != nullptr) {
             return view->streamRichText(device);
         }
@@ -186,7 +189,7 @@ void Recovery::forget(const UReportDoc *report)
 
 bool Recovery::keep()
 {
-    if (folder_.isEmpty()) {
+    if (!folder_) {
         return false;
     }
     isComplete_ = true;
@@ -197,9 +200,10 @@ bool Recovery::keep()
         if (report == nullptr || (!report->IsModified() && report->GetPathName().isEmpty())) {
             continue; // there is nothing to bring back
         }
+        const bool hasOwnFile = !isPdfName(report->GetPathName()); // a PDF does not bring the report back
         QJsonObject entry = {{QStringLiteral("title"), report->GetTitle()},
                              {QStringLiteral("path"), report->GetPathName()}};
-        if (report->IsModified()) {
+        if (report->IsModified() || !hasOwnFile) {
             entry.insert(QStringLiteral("text"), textFileOf(*report));
             kept.insert(report, written_.value(report));
         }
@@ -208,7 +212,7 @@ bool Recovery::keep()
     // Only then may texts go that the list named till now.
     const QByteArray bytes = QJsonDocument(list).toJson();
     if (bytes != list_) {
-        if (!writeFile(QDir(folder_).filePath(listName), bytes)) {
+        if (!folder_->writeList(bytes)) {
             return false;
         }
         list_ = bytes;
@@ -220,7 +224,7 @@ bool Recovery::keep()
     }
     gone_.removeAll(QString()); // of reports whose text was never written
     for (const QString &file : std::exchange(gone_, {})) {
-        QFile::remove(QDir(folder_).filePath(file));
+        folder_->removeText(file);
     }
     written_ = kept;
     return isComplete_;

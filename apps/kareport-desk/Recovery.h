@@ -1,5 +1,7 @@
 #pragma once
 
+#include "RecoveryFolder.h"
+
 #include <QHash>
 #include <QLockFile>
 #include <QString>
@@ -26,7 +28,7 @@ struct KeptReport
 /// Keeps what is open on the disk, so that it comes back after a crash.
 ///
 /// Every running program has a folder of its own, which goes with a regular end. A folder whose program no longer runs was
-/// left by a crash.
+/// left by a crash. Other folders, and links, are nobody's business here.
 class Recovery
 {
 public:
@@ -43,6 +45,8 @@ public:
     std::vector<KeptReport> leftReports() const;
     /// Opens one of them again, with what was not saved. @return null when it cannot be opened
     static UReportDoc *reopen(const KeptReport &kept);
+    /// Folders of programs that crashed whose lists cannot be read. They stay as they are.
+    const QStringList &unreadableFolders() const { return unreadable_; }
     /// Throws away what crashed programs left.
     void discardLeft();
 
@@ -62,9 +66,18 @@ private:
 
     QString textFileOf(const UReportDoc &report);
 
-    QString folder_; ///< of this program; empty when it cannot be made
+    struct Left
+    {
+        RecoveryFolder folder;
+        std::unique_ptr<QLockFile> lock;
+    };
+
+    void takeIfLeft(const RecoveryFolder &folder);
+
+    std::optional<RecoveryFolder> folder_; ///< of this program; nothing when it cannot be made
     std::unique_ptr<QLockFile> lock_;
-    std::vector<std::pair<QString, std::unique_ptr<QLockFile>>> left_; ///< folders of crashed programs
+    std::vector<Left> left_; ///< of crashed programs
+    QStringList unreadable_;
     QHash<const UReportDoc *, Written> written_;
     QStringList gone_; ///< texts that are no longer needed
     QByteArray list_;  ///< as it was written last

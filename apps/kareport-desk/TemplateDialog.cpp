@@ -1,6 +1,7 @@
 #include "TemplateDialog.h"
 
 #include "Folders.h"
+#include "PlainWidgets.h"
 #include "Profile.h"
 #include "TemplateNames.h"
 #include "TemplateSource.h"
@@ -45,7 +46,7 @@ TemplateDialog::TemplateDialog(QWidget *parent)
       template_(new QComboBox),
       output_(new QComboBox),
       data_(new QLineEdit),
-      message_(new QLabel),
+      message_(plainLabel()),
       buttons_(new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel))
 {
     setWindowTitle(Xlate("Report from Template"));
@@ -63,7 +64,7 @@ TemplateDialog::TemplateDialog(QWidget *parent)
 
     auto *form = new QFormLayout;
     const auto addRow = [form](const QString &text, QWidget *buddy, auto *row) {
-        auto *label = new QLabel(text);
+        auto *label = plainLabel(text);
         label->setBuddy(buddy);
         form->addRow(label, row);
     };

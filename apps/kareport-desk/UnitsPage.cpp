@@ -1,5 +1,6 @@
 #include "UnitsPage.h"
 
+#include "PlainWidgets.h"
 #include "UFormatAngle.h"
 #include "UFormatBearing.h"
 #include "Xlate.h"
@@ -55,11 +56,11 @@ void addPair(QFormLayout &form, const QString &label, QWidget *first, const QStr
 {
     auto *row = new QHBoxLayout;
     row->addWidget(first, 1);
-    auto *secondLabel = new QLabel(secondName);
+    auto *secondLabel = plainLabel(secondName);
     secondLabel->setBuddy(second);
     row->addWidget(secondLabel);
     row->addWidget(second);
-    auto *firstLabel = new QLabel(label);
+    auto *firstLabel = plainLabel(label);
     firstLabel->setBuddy(first);
     form.addRow(firstLabel, row);
 }
@@ -88,7 +89,7 @@ UnitsPage::UnitsPage(const UJobSettings &settings, QWidget *parent)
       bearingReference_(
           choice({Xlate("From north"), Xlate("From south")}, static_cast<int>(settings.bearingReference))),
       bearingPadding_(new QCheckBox(Xlate("Leading &zeros"))),
-      samples_(new QLabel)
+      samples_(plainLabel())
 {
     auto *layout = new QHBoxLayout(this);
     auto *form = new QFormLayout;
@@ -117,7 +118,7 @@ UnitsPage::UnitsPage(const UJobSettings &settings, QWidget *parent)
         connect(angleMarks_.at(i), &QLineEdit::textChanged, this, &UnitsPage::showSamples);
     }
     marks->addStretch();
-    auto *marksLabel = new QLabel(Xlate("Angle &marks:"));
+    auto *marksLabel = plainLabel(Xlate("Angle &marks:"));
     marksLabel->setBuddy(angleMarks_[0]);
     form->addRow(marksLabel, marks);
     layout->addLayout(form, 1);
@@ -125,7 +126,6 @@ UnitsPage::UnitsPage(const UJobSettings &settings, QWidget *parent)
     auto *sampleBox = new QGroupBox(Xlate("Looks like"));
     auto *sampleLayout = new QHBoxLayout(sampleBox);
     samples_->setFont(QFontDatabase::systemFont(QFontDatabase::FixedFont));
-    samples_->setTextFormat(Qt::PlainText);
     samples_->setAlignment(Qt::AlignTop | Qt::AlignLeft);
     sampleLayout->addWidget(samples_);
     layout->addWidget(sampleBox);

@@ -4,6 +4,7 @@
 #include <DefaultPrinter.h>
 #include <Folders.h>
 #include <Language.h>
+#include <PlainWidgets.h>
 #include <Profile.h>
 #include <ReportEntry.h>
 #include <ReportInitialTemplate.h>
@@ -17,7 +18,6 @@
 #include <QCloseEvent>
 #include <QFileDialog>
 #include <QMenuBar>
-#include <QMessageBox>
 
 #include <cstdio>
 
@@ -94,16 +94,8 @@ public:
         QMenu *menu = menuBar()->addMenu(QStringLiteral("&File"));
         AddCommand(*menu, 57604, QStringLiteral("Save &As...\tCtrl+Shift+S")); // handled by the report's view
         AddCommand(*menu, 57607, QStringLiteral("&Print...\tCtrl+P"));
-        const auto asking = QMessageBox::Yes | QMessageBox::No;
-        kareport::setMessageBox([this, asking](const kareport::Message &message) {
-            const QMessageBox::StandardButtons buttons[] = {QMessageBox::Ok, asking | QMessageBox::Cancel, asking};
-            switch (QMessageBox::question(this, message.caption, message.text, buttons[int(message.buttons)])) {
-            case QMessageBox::Ok: return MessageAnswer::Ok;
-            case QMessageBox::Yes: return MessageAnswer::Yes;
-            case QMessageBox::No: return MessageAnswer::No;
-            default: return MessageAnswer::Cancel;
-            }
-        });
+        kareport::setMessageBox(
+            [this](const kareport::Message &message) { return kareport::showMessageBox(this, message); });
         kareport::setSaveDialog([this](const kareport::SaveRequest &request) -> std::optional<QString> {
             const QString path = QFileDialog::getSaveFileName(this, QString(), request.initialFolder);
             return path.isEmpty() ? std::nullopt : std::optional(path);

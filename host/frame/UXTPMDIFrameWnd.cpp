@@ -2,6 +2,7 @@
 
 #include "COneViewPane.h"
 #include "PaneDock.h"
+#include "PlainTabTips.h"
 #include "UView.h"
 
 #include <QAction>
@@ -32,6 +33,7 @@ UXTPMDIFrameWnd::UXTPMDIFrameWnd(QWidget *parent) : QMainWindow(parent)
     setDockNestingEnabled(true);
     setDockOptions(dockOptions() | QMainWindow::AllowTabbedDocks | QMainWindow::GroupedDragging);
     setTabPosition(Qt::AllDockWidgetAreas, QTabWidget::North);
+    new kareport::PlainTabTips(*this);
     auto *timer = new QTimer(this);
     connect(timer, &QTimer::timeout, this, &UXTPMDIFrameWnd::UpdateCommands);
     timer->start(updateInterval);
