@@ -9,9 +9,10 @@
 namespace kareport
 {
 
-std::optional<QString> askReportName(bool richTextFirst)
+std::optional<QString> askReportName(UDocument &document, bool richTextFirst)
 {
     SaveRequest request;
+    request.document = &document;
     request.defaultExtension = QStringLiteral("rep");
     request.initialFolder = GetInitialOpenDir(lastReportFolder);
     request.flags = SaveRequest::hideReadOnly | SaveRequest::overwritePrompt | SaveRequest::pathMustExist;
@@ -25,9 +26,11 @@ std::optional<QString> askReportName(bool richTextFirst)
     return chosen;
 }
 
-void sayNotSaved(const QString &path)
+void sayNotSaved(const QString &path, const QString &reason)
 {
-    AppMessageBox(Xlate("\"%1\" could not be saved. Choose another folder, or make room on the disk.").arg(path));
+    AppMessageBox(reason.isEmpty()
+                      ? Xlate("\"%1\" could not be saved. Choose another folder, or make room on the disk.").arg(path)
+                      : Xlate("\"%1\" could not be saved: %2.").arg(path, reason));
 }
 
 } // namespace kareport

@@ -6,6 +6,8 @@
 
 #include <optional>
 
+class UDocument;
+
 namespace kareport
 {
 
@@ -15,8 +17,8 @@ inline const QString lastReportFolder = QStringLiteral("LastOpenDirectoryReport"
 /// Asks for the name of a file to save a report in, beginning with the folder used last, and keeps its folder.
 /// @param richTextFirst  offers rich text before report text
 /// @return nothing when the user has cancelled
-KAREPORT_EXPORT std::optional<QString> askReportName(bool richTextFirst);
-/// Says that a report could not be saved, and what to do.
-KAREPORT_EXPORT void sayNotSaved(const QString &path);
+KAREPORT_EXPORT std::optional<QString> askReportName(UDocument &document, bool richTextFirst);
+/// Says that a report could not be saved, and why. @param reason  empty when it is not known: what to do is said then
+KAREPORT_EXPORT void sayNotSaved(const QString &path, const QString &reason = QString());
 
 } // namespace kareport

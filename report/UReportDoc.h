@@ -309,6 +309,8 @@ public:
     /// any other the report text. An empty report text is saved by doing nothing.
     /// @return false when it could not be written: an earlier file is then as it was
     bool OnSaveDocument(const QString &path) override;
+    /// Why the last `OnSaveDocument` failed, as the end of a sentence; empty when it did not, or nothing is known.
+    const QString &GetSaveProblem() const { return saveProblem_; }
     /// Saves through `OnSaveDocument`. @return 0 for an empty path, else 1 whether the save succeeded or not: callers go on
     /// either way
     int SaveFile(const QString &path);
@@ -403,6 +405,7 @@ private:
     bool closeDocument_;
     quint64 editCount_ = 0;
     bool openedFromRtf_ = false;
+    QString saveProblem_;
     bool isSerializing_ = false;
     kareport::RichTextImage image_;
     void *textObject_ = nullptr;

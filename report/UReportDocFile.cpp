@@ -40,7 +40,7 @@ bool UReportDoc::DoSave(const QString &path, bool replace)
     bool isSaved = false;
     QString name = path;
     if (path.isEmpty() || replace) {
-        const auto chosen = kareport::askReportName(openedFromRtf_);
+        const auto chosen = kareport::askReportName(*this, openedFromRtf_);
         if (!chosen) {
             return false;
         }
@@ -51,7 +51,8 @@ bool UReportDoc::DoSave(const QString &path, bool replace)
         isSaved = OnSaveDocument(name);
     }
     if (!isSaved) {
-        kareport::sayNotSaved(name);
+        // A view that was updated may have closed the report.
+        kareport::sayNotSaved(name, IsReportAvailable(this) ? saveProblem_ : QString());
         return false;
     }
     if (replace) {
@@ -63,8 +64,10 @@ bool UReportDoc::DoSave(const QString &path, bool replace)
 
 bool UReportDoc::OnSaveDocument(const QString &path)
 {
+    saveProblem_.clear();
     const bool isSaved = saveByName(path);
     if (isSaved) {
+        saveProblem_.clear(); // a view that could not write left its reason to the next one
         OnDocumentEvent(DocumentEvent::AfterSaveDocument);
     }
     return isSaved;
@@ -78,7 +81,13 @@ bool UReportDoc::saveByName(const QString &path)
         return saved ? *saved : saveText(path);
     }
     if (isPdfName(path)) {
-        return kareport::replaceFile(path, [this](QIODevice &device) { return WritePdf(device); });
+        kareport::PdfNotes notes;
+        const bool isSaved = kareport::replaceFile(
+            path, [this, &notes](QIODevice &device) { return WritePdf(device, &notes); }, &saveProblem_);
+        if (!notes.problem.isEmpty()) {
+            saveProblem_ = notes.problem;
+        }
+        return isSaved;
     }
     return saveText(path);
 }
@@ -99,10 +108,13 @@ std::optional<bool> UReportDoc::saveViewAsRichText(const QString &path)
         }
         bool isOpen = false;
         const auto *port = dynamic_cast<const kareport::ReportViewPort *>(view);
-        const bool saved = kareport::replaceFile(path, [&](QIODevice &device) {
-            isOpen = true;
-            return port->streamRichText(device);
-        });
+        const bool saved = kareport::replaceFile(
+            path,
+            [&](QIODevice &device) {
+                isOpen = true;
+                return port->streamRichText(device);
+            },
+            &saveProblem_);
         if (saved) {
             openSavedFile(path);
         }
@@ -116,10 +128,11 @@ std::optional<bool> UReportDoc::saveViewAsRichText(const QString &path)
 bool UReportDoc::saveText(const QString &path)
 {
     // An empty report is saved by doing nothing: no file is made and none is emptied.
-    if (!IsEmpty() && !kareport::replaceFile(path, [this](QIODevice &device) {
-            return WriteText(device, kareport::LineEnds::ReportFile);
-        }))
-    {
+    const auto write = [this](QIODevice &device) { return WriteText(device, kareport::LineEnds::ReportFile); };
+    if (!IsEmpty() && !kareport::replaceFile(path, write, &saveProblem_)) {
+        if (HasLostText()) {
+            saveProblem_ = Xlate("a part of the report was lost when memory ran out");
+        }
         return false;
     }
     SetModifiedFlag(false);

@@ -1,10 +1,12 @@
 #pragma once
 
+#include "KaReportExport.h"
+
 namespace kareport
 {
 
 /// Shows the wait cursor while it lives, in a program with windows.
-class WaitCursor
+class KAREPORT_EXPORT WaitCursor
 {
 public:
     WaitCursor();

@@ -269,6 +269,11 @@
         <translation>„%1“ konnte nicht gespeichert werden. Einen anderen Ordner wählen oder Platz auf dem Datenträger schaffen.</translation>
     </message>
     <message>
+        <location filename="../report/ReportSaveName.cpp"/>
+        <source>"%1" could not be saved: %2.</source>
+        <translation>„%1“ konnte nicht gespeichert werden: %2.</translation>
+    </message>
+    <message>
         <location filename="../report/UReportDoc.cpp"/>
         <source>Station</source>
         <translation>Station</translation>
@@ -278,6 +283,11 @@
         <source>   Page:</source>
         <comment>Report Header</comment>
         <translation>   Seite:</translation>
+    </message>
+    <message>
+        <location filename="../report/UReportDocFile.cpp"/>
+        <source>a part of the report was lost when memory ran out</source>
+        <translation>ein Teil des Berichts ging verloren, als der Speicher ausging</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
@@ -1141,6 +1151,11 @@
     </message>
     <message>
         <location filename="../apps/kareport/ViewCommand.cpp"/>
+        <source>A PDF cannot be opened as a report</source>
+        <translation>Eine PDF-Datei kann nicht als Bericht geöffnet werden</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/ViewCommand.cpp"/>
         <source>the program kareport-desk is not installed</source>
         <translation>das Programm kareport-desk ist nicht installiert</translation>
     </message>
@@ -1153,11 +1168,6 @@
         <location filename="../apps/kareport/ViewCommand.cpp"/>
         <source>"%1" could not be started</source>
         <translation>„%1“ konnte nicht gestartet werden</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskDialogs.cpp"/>
-        <source>Save As</source>
-        <translation>Speichern unter</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
@@ -1181,13 +1191,17 @@
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>There is no file "%1".</source>
-        <translation>Es gibt keine Datei „%1“.</translation>
+        <source>"%1" could not be opened.</source>
+        <translation>„%1“ konnte nicht geöffnet werden.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>"%1" could not be opened.</source>
-        <translation>„%1“ konnte nicht geöffnet werden.</translation>
+        <source>KaReport did not end properly, and what it had open cannot be read. These folders are left as they are:
+
+%1</source>
+        <translation>KaReport wurde nicht ordentlich beendet, und was offen war, ist nicht lesbar. Diese Ordner bleiben, wie sie sind:
+
+%1</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
@@ -1228,17 +1242,17 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>About KaReport</source>
-        <translation>Über KaReport</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>KaReport: fixed-pitch reports for civil engineering and surveying.
 
 Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and print it. Ctrl+F finds text, Ctrl+G goes to a page, Ctrl+wheel zooms.</source>
         <translation>KaReport: Berichte in dicktengleicher Schrift für Tiefbau und Vermessung.
 
 Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.rep, .rtf) kann gelesen, bearbeitet und gedruckt werden. Strg+F sucht Text, Strg+G springt zu einer Seite, Strg+Mausrad ändert die Ansichtsgröße.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
+        <source>About KaReport</source>
+        <translation>Über KaReport</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
@@ -1502,6 +1516,11 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
+        <source>it is a folder, a pipe or a device</source>
+        <translation>das ist ein Ordner, eine Pipe oder ein Gerät</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
         <source>Another job is running. Wait for its end, or cancel it.</source>
         <translation>Ein anderer Auftrag läuft gerade. Sein Ende abwarten oder ihn abbrechen.</translation>
     </message>
@@ -1564,6 +1583,40 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Pro&amp;gram</source>
         <translation>Pro&amp;gramm</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SaveAs.cpp"/>
+        <source>There is a file "%1" already. Replace it?</source>
+        <translation>Die Datei „%1“ gibt es schon. Ersetzen?</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SaveAs.cpp"/>
+        <source>the report is empty, and a PDF has one page at least</source>
+        <translation>der Bericht ist leer, und eine PDF-Datei hat mindestens eine Seite</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SaveAs.cpp"/>
+        <source>"%1" was saved, but it differs from the report:
+
+%2</source>
+        <translation>„%1“ wurde gespeichert, weicht aber vom Bericht ab:
+
+%2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SaveAs.cpp"/>
+        <source>Save As</source>
+        <translation>Speichern unter</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SavedReports.cpp"/>
+        <source>There is no file "%1".</source>
+        <translation>Es gibt keine Datei „%1“.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SavedReports.cpp"/>
+        <source>"%1" is a folder, a pipe or a device. Only files can be opened here.</source>
+        <translation>„%1“ ist ein Ordner, eine Pipe oder ein Gerät. Hier lassen sich nur Dateien öffnen.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>

@@ -269,6 +269,11 @@
         <translation>「%1」を保存できませんでした。別のフォルダーを選ぶか、ディスクの空き容量を増やしてください。</translation>
     </message>
     <message>
+        <location filename="../report/ReportSaveName.cpp"/>
+        <source>"%1" could not be saved: %2.</source>
+        <translation>「%1」を保存できませんでした: %2</translation>
+    </message>
+    <message>
         <location filename="../report/UReportDoc.cpp"/>
         <source>Station</source>
         <translation>測点No.</translation>
@@ -278,6 +283,11 @@
         <source>   Page:</source>
         <comment>Report Header</comment>
         <translation>   頁:</translation>
+    </message>
+    <message>
+        <location filename="../report/UReportDocFile.cpp"/>
+        <source>a part of the report was lost when memory ran out</source>
+        <translation>メモリ不足でレポートの一部が失われました</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
@@ -1141,6 +1151,11 @@
     </message>
     <message>
         <location filename="../apps/kareport/ViewCommand.cpp"/>
+        <source>A PDF cannot be opened as a report</source>
+        <translation>PDFはレポートとして開けません</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/ViewCommand.cpp"/>
         <source>the program kareport-desk is not installed</source>
         <translation>プログラム kareport-desk がインストールされていません</translation>
     </message>
@@ -1153,11 +1168,6 @@
         <location filename="../apps/kareport/ViewCommand.cpp"/>
         <source>"%1" could not be started</source>
         <translation>「%1」を起動できませんでした</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskDialogs.cpp"/>
-        <source>Save As</source>
-        <translation>名前を付けて保存</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
@@ -1181,13 +1191,17 @@
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>There is no file "%1".</source>
-        <translation>ファイル「%1」がありません。</translation>
+        <source>"%1" could not be opened.</source>
+        <translation>「%1」を開けませんでした。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>"%1" could not be opened.</source>
-        <translation>「%1」を開けませんでした。</translation>
+        <source>KaReport did not end properly, and what it had open cannot be read. These folders are left as they are:
+
+%1</source>
+        <translation>KaReportは正常に終了しませんでした。開いていたレポートの一覧を読み取れません。次のフォルダーはそのまま残します:
+
+%1</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
@@ -1228,17 +1242,17 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>About KaReport</source>
-        <translation>KaReport について</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>KaReport: fixed-pitch reports for civil engineering and surveying.
 
 Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and print it. Ctrl+F finds text, Ctrl+G goes to a page, Ctrl+wheel zooms.</source>
         <translation>KaReport: 土木・測量のための等幅帳票。
 
 ジョブ (.json) を開くと実行されます。保存した帳票 (.rep, .rtf) を開くと、閲覧、編集、印刷ができます。Ctrl+F で検索、Ctrl+G でページへ移動、Ctrl+ホイールで拡大/縮小します。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
+        <source>About KaReport</source>
+        <translation>KaReport について</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
@@ -1502,6 +1516,11 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
+        <source>it is a folder, a pipe or a device</source>
+        <translation>フォルダー、パイプ、またはデバイスです</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
         <source>Another job is running. Wait for its end, or cancel it.</source>
         <translation>別のジョブが実行中です。終了を待つか、中止してください。</translation>
     </message>
@@ -1564,6 +1583,40 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Pro&amp;gram</source>
         <translation>プログラム(&amp;G)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SaveAs.cpp"/>
+        <source>There is a file "%1" already. Replace it?</source>
+        <translation>ファイル「%1」は既にあります。置き換えますか?</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SaveAs.cpp"/>
+        <source>the report is empty, and a PDF has one page at least</source>
+        <translation>レポートが空です。PDFには少なくとも1ページ必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SaveAs.cpp"/>
+        <source>"%1" was saved, but it differs from the report:
+
+%2</source>
+        <translation>「%1」を保存しましたが、レポートと異なる点があります:
+
+%2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SaveAs.cpp"/>
+        <source>Save As</source>
+        <translation>名前を付けて保存</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SavedReports.cpp"/>
+        <source>There is no file "%1".</source>
+        <translation>ファイル「%1」がありません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SavedReports.cpp"/>
+        <source>"%1" is a folder, a pipe or a device. Only files can be opened here.</source>
+        <translation>「%1」はフォルダー、パイプ、またはデバイスです。ここで開けるのはファイルだけです。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>

@@ -64,7 +64,7 @@ void UReportWindowDlg::OnSave()
     if (report == nullptr) {
         return;
     }
-    const auto path = kareport::askReportName(false);
+    const auto path = kareport::askReportName(*report, false);
     if (!path) {
         return;
     }
@@ -73,9 +73,10 @@ void UReportWindowDlg::OnSave()
         return;
     }
     const bool isSaved = report->OnSaveDocument(*path);
+    const bool isOpen = UReportDoc::IsReportAvailable(report);
     if (!isSaved) {
-        kareport::sayNotSaved(*path);
-    } else if (UReportDoc::IsReportAvailable(report)) {
+        kareport::sayNotSaved(*path, isOpen ? report->GetSaveProblem() : QString());
+    } else if (isOpen) {
         report->SetModifiedFlag(false);
     }
 }

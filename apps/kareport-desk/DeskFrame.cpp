@@ -3,6 +3,7 @@
 #include "AppMessageBox.h"
 #include "Folders.h"
 #include "JobLauncher.h"
+#include "PdfFile.h"
 #include "PreferencesDialog.h"
 #include "ReportEntry.h"
 #include "ReportSaveName.h"
@@ -20,7 +21,6 @@
 #include <QDragEnterEvent>
 #include <QFileDialog>
 #include <QFileInfo>
-#include <QMessageBox>
 #include <QMimeData>
 #include <QStatusBar>
 #include <QTimer>
@@ -198,6 +198,11 @@ bool DeskFrame::OpenTemplateJob(const kareport::TemplateJob &job)
 
 bool DeskFrame::OpenFile(const QString &path)
 {
+    if (const QString reason = kareport::whyNotOpened(path); !reason.isEmpty()) {
+        kareport::showMessage(
+            {reason, QFileInfo(path).fileName(), MessageButtons::Ok, kareport::MessageIcon::Information});
+        return false;
+    }
     if (path.endsWith(u".xml", Qt::CaseInsensitive)) {
         fromTemplate(path);
         return true;
@@ -209,8 +214,6 @@ bool DeskFrame::OpenFile(const QString &path)
         if (report != nullptr) {
             UApplication::Get()->AddToRecentFileList(path);
         }
-    } else if (!QFileInfo(path).isFile()) {
-        error = Xlate("There is no file \"%1\".").arg(path);
     } else {
         const QString file = QDir::cleanPath(QFileInfo(path).absoluteFilePath());
         report = documentOf(file);
@@ -228,6 +231,13 @@ bool DeskFrame::OpenFile(const QString &path)
 void DeskFrame::OfferLeftReports()
 {
     const std::vector<kareport::KeptReport> left = recovery_.leftReports();
+    if (!recovery_.unreadableFolders().isEmpty()) {
+        kareport::showMessage(
+            {Xlate("KaReport did not end properly, and what it had open cannot be read. These folders "
+                   "are left as they are:\n\n%1")
+                 .arg(recovery_.unreadableFolders().join(u'\n')),
+             QString(), MessageButtons::Ok, kareport::MessageIcon::Information});
+    }
     QStringList names;
     for (const kareport::KeptReport &kept : left) {
         names.append(kept.name() +
@@ -277,7 +287,8 @@ void DeskFrame::NoteDocumentEvent(UDocument &document, UDocument::DocumentEvent 
             }
             files_.retain(paths);
             const bool isClosed = event == UDocument::DocumentEvent::AfterCloseDocument;
-            if (!isClosed && isOpen(&document) && !document.GetPathName().isEmpty()) {
+            if (!isClosed && isOpen(&document) && !document.GetPathName().isEmpty() &&
+                !kareport::isPdfName(document.GetPathName())) {
                 files_.watch(document.GetPathName());
             }
         },
@@ -299,7 +310,9 @@ void DeskFrame::fileChanged(const QString &path)
         const MessageAnswer answer = kareport::showMessage(
             {question.arg(path), QString(), MessageButtons::YesNo, kareport::MessageIcon::Question});
         if (answer == MessageAnswer::Yes && isOpen(document) && !kareport::reloadSavedReport(*document)) {
-            AppMessageBox(Xlate("\"%1\" could not be opened.").arg(path));
+            document->SetModifiedFlag(true); // what is shown stands in no file any more
+            const QString reason = kareport::whyNotOpened(path);
+            AppMessageBox(reason.isEmpty() ? Xlate("\"%1\" could not be opened.").arg(path) : reason);
         }
         return;
     }
@@ -307,10 +320,11 @@ void DeskFrame::fileChanged(const QString &path)
 
 void DeskFrame::about()
 {
-    QMessageBox::about(this, Xlate("About KaReport"),
-                       Xlate("KaReport: fixed-pitch reports for civil engineering and surveying.\n\n"
-                             "Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and print it. "
-                             "Ctrl+F finds text, Ctrl+G goes to a page, Ctrl+wheel zooms."));
+    kareport::showMessage(
+        {Xlate("KaReport: fixed-pitch reports for civil engineering and surveying.\n\n"
+               "Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and print it. "
+               "Ctrl+F finds text, Ctrl+G goes to a page, Ctrl+wheel zooms."),
+         Xlate("About KaReport"), MessageButtons::Ok, kareport::MessageIcon::Information});
 }
 
 void DeskFrame::closeEvent(QCloseEvent *event)

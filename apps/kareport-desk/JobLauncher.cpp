@@ -5,6 +5,7 @@
 #include "Interrupt.h"
 #include "JobReader.h"
 #include "JobRunner.h"
+#include "PlainWidgets.h"
 #include "Preferences.h"
 #include "Progress.h"
 #include "ReportWindow.h"
@@ -14,6 +15,7 @@
 #include <QCoreApplication>
 #include <QElapsedTimer>
 #include <QFileInfo>
+#include <QLabel>
 #include <QProgressDialog>
 #include <QScopedValueRollback>
 
@@ -32,6 +34,7 @@ class DialogProgress : public Progress
 public:
     explicit DialogProgress(QWidget *parent) : Progress(true), dialog_(QString(), Xlate("Cancel"), 0, 100, parent)
     {
+        dialog_.setLabel(plainLabel()); // it names files
         dialog_.setWindowModality(Qt::ApplicationModal);
         // Only this class says when it comes and goes: while it is not there, nothing keeps the user from other windows.
         dialog_.setMinimumDuration(INT_MAX);
@@ -96,6 +99,21 @@ UReportDoc *makeShown(bool header, const QString &caption)
     return report;
 }
 
+/// Says in a job which of its data files is none: reading a pipe or a device might never end, and nothing could stop it.
+void refuseWhatIsNoFile(const Job &job, JsonSource &source)
+{
+    QStringList names = job.data.keys();
+    names.sort();
+    for (const QString &name : names) {
+        const QString &csv = job.data.constFind(name)->csv;
+        if (QFileInfo(csv).exists() && !QFileInfo(csv).isFile()) {
+            JsonNode(source)["data"][name]["csv"].fail(
+                Xlate("the data file \"%1\" cannot be read: %2").arg(csv, Xlate("it is a folder, a pipe or a device")));
+            return;
+        }
+    }
+}
+
 UReportDoc *runJob(Expected<JsonSource> read, QWidget *parent, QString &error)
 {
     if (const InputError *wrong = errorOf(read)) {
@@ -104,6 +122,9 @@ UReportDoc *runJob(Expected<JsonSource> read, QWidget *parent, QString &error)
     }
     auto &source = std::get<JsonSource>(read);
     const Job job = readJob(source, std::nullopt, loadPreferences().jobDefaults());
+    if (!source.error()) {
+        refuseWhatIsNoFile(job, source);
+    }
     if (source.error()) {
         error = source.error()->message();
         return nullptr;

@@ -1,13 +1,16 @@
 #include "SavedReports.h"
 
 #include "FileBytes.h"
+#include "PdfFile.h"
 #include "ReportEntry.h"
 #include "ReportTextDecoder.h"
 #include "RichTextReader.h"
 #include "SavedText.h"
 #include "UReportDoc.h"
+#include "Xlate.h"
 
 #include <QFile>
+#include <QFileInfo>
 
 #include <optional>
 
@@ -47,8 +50,23 @@ void fill(UReportDoc &report, const QString &text)
 
 } // namespace
 
+QString whyNotOpened(const QString &path)
+{
+    const QFileInfo info(path);
+    if (!info.exists()) {
+        return Xlate("There is no file \"%1\".").arg(path);
+    }
+    if (!info.isFile()) {
+        return Xlate("\"%1\" is a folder, a pipe or a device. Only files can be opened here.").arg(path);
+    }
+    return isPdfFile(path) ? Xlate("A PDF cannot be opened as a report") : QString();
+}
+
 UReportDoc *openSavedReport(const QString &path)
 {
+    if (!whyNotOpened(path).isEmpty()) {
+        return nullptr;
+    }
     const auto text = exactText(path);
     if (!text) {
         return dynamic_cast<UReportDoc *>(GetReportTemplate()->OpenReportDocumentFile(path, 1, 1, nullptr, 0, nullptr));
@@ -64,7 +82,7 @@ UReportDoc *openSavedReport(const QString &path)
 
 bool reloadSavedReport(UReportDoc &report)
 {
-    if (!QFile(report.GetPathName()).open(QIODevice::ReadOnly)) {
+    if (!whyNotOpened(report.GetPathName()).isEmpty() || !QFile(report.GetPathName()).open(QIODevice::ReadOnly)) {
         return false; // what is shown is then all that there is
     }
     if (const auto text = exactText(report.GetPathName())) {

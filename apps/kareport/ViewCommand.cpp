@@ -1,5 +1,6 @@
 #include "Commands.h"
 
+#include "PdfFile.h"
 #include "Xlate.h"
 
 #include <QCoreApplication>
@@ -41,6 +42,9 @@ ExitStatus ViewCommand::run(int &argc, char **argv) const
     const QFileInfo shown(file);
     if (!shown.isFile()) {
         return fail(exitInput, Xlate("there is no file \"%1\"").arg(file));
+    }
+    if (isPdfFile(file)) {
+        return fail(exitInput, QStringLiteral("\"%1\": ").arg(file) + Xlate("A PDF cannot be opened as a report"));
     }
     const QString desk = deskProgram();
     if (desk.isEmpty()) {

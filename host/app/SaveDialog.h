@@ -7,6 +7,8 @@
 #include <functional>
 #include <optional>
 
+class UDocument;
+
 namespace kareport
 {
 
@@ -23,6 +25,7 @@ struct SaveRequest
     /// Pairs of a kind's title and its name pattern, each behind a "|", ended by "||".
     QString filter;
     unsigned flags = 0;
+    UDocument *document = nullptr; ///< that is to be saved; may be null
 };
 
 /// Shows the dialog. @return the full path that was chosen, or nothing when it was cancelled

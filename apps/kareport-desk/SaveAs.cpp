@@ -1,0 +1,128 @@
+#include "SaveAs.h"
+
+#include "AppMessageBox.h"
+#include "PdfExport.h"
+#include "PdfFile.h"
+#include "ReplaceFile.h"
+#include "ReportSaveName.h"
+#include "UReportDoc.h"
+#include "WaitCursor.h"
+#include "Xlate.h"
+
+#include <QAbstractItemView>
+#include <QFileDialog>
+#include <QFileInfo>
+
+#include <algorithm>
+
+namespace kareport
+{
+
+namespace
+{
+
+/// A kind of file that a save dialog offers.
+struct FileKind
+{
+    QString title;   ///< as Qt shows it, with its pattern
+    QString pattern; ///< "*" for all files
+};
+
+std::vector<FileKind> kindsOf(const QString &filter)
+{
+    std::vector<FileKind> kinds;
+    const QStringList parts = filter.split(u'|', Qt::SkipEmptyParts);
+    for (qsizetype i = 0; i + 1 < parts.size(); i += 2) {
+        // The pattern after the title counts, not the one that the title shows. On this platform "*.*" would leave out
+        // names without a dot.
+        const QString pattern = parts[i + 1] == u"*.*" ? QStringLiteral("*") : parts[i + 1];
+        kinds.push_back(
+            {parts[i].section(QStringLiteral(" ("), 0, 0) + QStringLiteral(" (") + pattern + u')', pattern});
+    }
+    return kinds;
+}
+
+bool mayReplace(const QString &path, const SaveRequest &request)
+{
+    if ((request.flags & SaveRequest::overwritePrompt) == 0 || !QFileInfo::exists(path)) {
+        return true;
+    }
+    return showMessage({Xlate("There is a file \"%1\" already. Replace it?").arg(path), QString(),
+                        MessageButtons::YesNo, MessageIcon::Question}) == MessageAnswer::Yes;
+}
+
+/// Writes a report as a PDF, and says what is not in it or why it could not be written.
+void exportPdf(const UReportDoc &report, const QString &path)
+{
+    PdfNotes notes;
+    QString problem;
+    bool isWritten = false;
+    if (report.IsEmpty()) {
+        problem = Xlate("the report is empty, and a PDF has one page at least");
+    } else {
+        const WaitCursor cursor;
+        isWritten = replaceFile(
+            path, [&report, &notes](QIODevice &device) { return report.WritePdf(device, &notes); }, &problem);
+    }
+    if (!isWritten) {
+        sayNotSaved(path, notes.problem.isEmpty() ? problem : notes.problem);
+    } else if (const QStringList warnings = notes.warnings(); !warnings.isEmpty()) {
+        showMessage({Xlate("\"%1\" was saved, but it differs from the report:\n\n%2").arg(path, warnings.join(u'\n')),
+                     QString(), MessageButtons::Ok, MessageIcon::Information});
+    }
+}
+
+} // namespace
+
+QString withEndingOf(const QString &path, const QString &kind, const QStringList &kinds)
+{
+    const bool isKnown = std::any_of(kinds.begin(), kinds.end(), [&path](const QString &known) {
+        return known.startsWith(u"*.") && path.endsWith(QStringView(known).sliced(1), Qt::CaseInsensitive);
+    });
+    return isKnown || !kind.startsWith(u"*.") ? path : path + kind.sliced(path.endsWith(u'.') ? 2 : 1);
+}
+
+std::optional<QString> askSavePath(QWidget *parent, const SaveRequest &request)
+{
+    const std::vector<FileKind> kinds = kindsOf(request.filter);
+    QStringList titles;
+    QStringList patterns;
+    for (const FileKind &kind : kinds) {
+        titles.append(kind.title);
+        patterns.append(kind.pattern);
+    }
+    QFileDialog dialog(parent, Xlate("Save As"), request.initialFolder);
+    dialog.setNameFilters(titles);
+    dialog.setAcceptMode(QFileDialog::AcceptSave);
+    // The name is not complete yet when the dialog would ask, and its questions take names for HTML.
+    dialog.setOption(QFileDialog::DontConfirmOverwrite);
+    for (QAbstractItemView *view : dialog.findChildren<QAbstractItemView *>()) {
+        view->setContextMenuPolicy(Qt::NoContextMenu); // it would ask before it deletes a file
+    }
+    if (!request.fileName.isEmpty()) {
+        dialog.selectFile(request.fileName);
+    }
+    while (dialog.exec() == QDialog::Accepted) {
+        const qsizetype chosen = titles.indexOf(dialog.selectedNameFilter());
+        const QString path = withEndingOf(dialog.selectedFiles().value(0), patterns.value(chosen), patterns);
+        if (mayReplace(path, request)) {
+            return path;
+        }
+    }
+    return std::nullopt;
+}
+
+std::optional<QString> askOwnName(const SaveRequest &request,
+                                  const std::function<std::optional<QString>(const SaveRequest &)> &ask)
+{
+    const auto path = ask(request);
+    const auto *report = dynamic_cast<const UReportDoc *>(request.document);
+    // The report may have been closed while the dialog was open.
+    if (!path || report == nullptr || !isPdfName(*path) || !UReportDoc::IsReportAvailable(report)) {
+        return path;
+    }
+    exportPdf(*report, *path);
+    return std::nullopt;
+}
+
+} // namespace kareport
