@@ -76,10 +76,10 @@ RichTextCodePage::RichTextCodePage(int number)
     }
     std::copy(western.begin(), western.end(), table_.begin() + 0x80);
     if (number == symbolCodePage) {
-        // Signs have no characters of their own; U+F000 to U+F0FF is where fonts of signs keep them. The bullet is the
-        // one that lists begin with, and is there in every font.
+        // What the sign of a font is, is known where the font is. Letters stay: many fonts that say to hold signs hold
+        // letters.
         for (std::size_t byte = 0x80; byte < table_.size(); ++byte) {
-            table_[byte] = symbolCharacter(static_cast<char16_t>(0xF000 + byte));
+            table_[byte] = static_cast<char16_t>(0xF000 + byte);
         }
         return;
     }
@@ -133,12 +133,6 @@ int codePageOfCharset(int charset)
         }
     }
     return 0;
-}
-
-char16_t symbolCharacter(char16_t character)
-{
-    constexpr char16_t bullet = 0x2022;
-    return character == 0xF0B7 ? bullet : character;
 }
 
 } // namespace kareport

@@ -48,7 +48,4 @@ private:
 /// The code page that a font's character set stands for; 0: that of the file.
 int codePageOfCharset(int charset);
 
-/// A sign of U+F000 to U+F0FF, as fonts of signs number them, as the character that every font has, where there is one.
-char16_t symbolCharacter(char16_t character);
-
 } // namespace kareport

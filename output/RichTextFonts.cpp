@@ -1,5 +1,6 @@
 #include "RichTextFonts.h"
 
+#include <algorithm>
 #include <utility>
 
 namespace kareport
@@ -14,7 +15,9 @@ int RichTextFonts::find(int number) const
     if (found != numbers_.end()) {
         return found->second;
     }
-    return fonts_.empty() ? -1 : 0;
+    const auto letters =
+        std::find_if(fonts_.begin(), fonts_.end(), [](const RichTextFont &font) { return !font.hasSignBytes(); });
+    return letters == fonts_.end() ? -1 : static_cast<int>(letters - fonts_.begin());
 }
 
 void RichTextFonts::begin(int number)
@@ -27,6 +30,7 @@ void RichTextFonts::commit()
 {
     current_.family = std::move(current_.family).trimmed();
     if (!current_.family.isEmpty()) {
+        current_.signs = signsOfFont(current_.family);
         numbers_[currentNumber_] = static_cast<int>(fonts_.size());
         fonts_.push_back(std::move(current_));
     }

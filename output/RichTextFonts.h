@@ -1,5 +1,8 @@
 #pragma once
 
+#include "RichTextCodePage.h"
+#include "RichTextSigns.h"
+
 #include <QFont>
 #include <QString>
 
@@ -13,14 +16,19 @@ struct RichTextFont
 {
     QString family;
     QFont::StyleHint kind = QFont::AnyStyle;
-    int codePage = 0; ///< 0: that of the file
+    int codePage = 0;                     ///< 0: that of the file
+    const RichTextSigns *signs = nullptr; ///< where the font holds signs that are known
+
+    /// Whether its bytes are numbers of signs.
+    bool hasSignBytes() const { return codePage == symbolCodePage || (signs != nullptr && codePage == 0); }
 };
 
 /// The font table of a file. Fonts are known by their place in the table, not by the numbers that the file gives them.
 class RichTextFonts
 {
 public:
-    /// The font with the file's number; the default one where the table does not have the number, -1 where it is empty.
+    /// The font with the file's number; the default one where the table does not have the number, the first one of letters
+    /// where it does not have that either, else -1.
     int find(int number) const;
     int defaultFont() const { return find(defaultNumber_); }
     void setDefaultNumber(int number) { defaultNumber_ = number; }

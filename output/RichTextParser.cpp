@@ -186,6 +186,8 @@ void RichTextParser::readText(std::string_view bytes)
     case RichTextDestination::Body:
         if (isShown()) {
             putRawBytes(bytes);
+        } else if (!isBlank(bytes)) {
+            noteHidden();
         }
         break;
     case RichTextDestination::FontTable:
@@ -224,9 +226,15 @@ void RichTextParser::readByte(char byte)
 {
     if (fallback_ > 0) {
         --fallback_;
+    } else if (state_.hasSignBytes && static_cast<unsigned char>(byte) < 0x80 &&
+               state_.destination != RichTextDestination::FontTable)
+    {
+        putSigns(std::string_view(&byte, 1));
     } else if (!state_.codePage->isSingleByte()) {
         if (isShown() || state_.destination == RichTextDestination::FontTable) {
             bytes_.append(byte);
+        } else {
+            noteHidden();
         }
     } else {
         put(state_.codePage->character(byte));
@@ -249,10 +257,7 @@ void RichTextParser::readUnicode(int number)
         put(QChar::lowSurrogate(code));
         return;
     }
-    const int font = state_.characters.font;
-    const bool isSign = font >= 0 && fonts_[font].codePage == symbolCodePage;
-    const auto character = static_cast<char16_t>(code);
-    put(isSign ? symbolCharacter(character) : character);
+    put(static_cast<char16_t>(code));
 }
 
 } // namespace kareport

@@ -67,10 +67,13 @@ private:
     std::string_view withoutFallback(std::string_view bytes);
     void flushBytes();
     void put(char16_t character);
+    void putSign(char16_t character);
+    void putSigns(std::string_view bytes);
     void putText(QStringView text);
     void putAscii(std::string_view bytes);
     void putRawBytes(std::string_view bytes);
     void beforeText();
+    void noteHidden();
     int format();
     void endParagraph();
     void endRow(bool isNested);
@@ -81,10 +84,8 @@ private:
         // The group that is passed over is among the open ones as well.
         return outer_.size() + static_cast<std::size_t>(skipDepth_ > 0 ? skipDepth_ - 1 : 0);
     }
-    bool isShown() const
-    {
-        return state_.destination == RichTextDestination::Body && (state_.characters.flags & HiddenFlag) == 0;
-    }
+    bool isHidden() const { return (state_.characters.flags & HiddenFlag) != 0; }
+    bool isShown() const { return state_.destination == RichTextDestination::Body && !isHidden(); }
 
     RichTextTokens tokens_;
     RichTextRawBytes rawBytes_;
@@ -105,7 +106,8 @@ private:
     QByteArray bytes_;                 ///< of characters that may have several bytes
     bool cellEnded_ = false;           ///< a tab stands here if more follows in the row
     bool nestedRowEnded_ = false;
-    bool pageBreak_ = false; ///< before the next paragraph
+    bool hiddenCounted_ = false; ///< the hidden text that is being passed over
+    bool pageBreak_ = false;     ///< before the next paragraph
     bool sectionBreak_ = false;
     std::unique_ptr<RichTextTarget> target_;
 };

@@ -61,9 +61,28 @@ void RichTextParser::putAscii(std::string_view bytes)
     const QLatin1StringView text(bytes.data(), static_cast<qsizetype>(bytes.size()));
     if (state_.destination == RichTextDestination::FontTable) {
         fonts_.current().family.append(text);
+    } else if (state_.hasSignBytes) {
+        putSigns(bytes);
     } else if (isShown()) {
         beforeText();
         target_->append(text, format());
+    } else {
+        noteHidden();
+    }
+}
+
+/// Puts the signs that bytes below 0x80 are the numbers of. Of a font that is not known they stay what they are: many a font
+/// of letters says to hold signs.
+void RichTextParser::putSigns(std::string_view bytes)
+{
+    for (const char byte : bytes) {
+        const bool isSign = byte > ' ';
+        if (isSign && state_.signs != nullptr) {
+            put(static_cast<char16_t>(0xF000 + static_cast<unsigned char>(byte)));
+        } else {
+            notes_.signs += isSign && isShown() ? 1 : 0;
+            put(static_cast<unsigned char>(byte));
+        }
     }
 }
 
@@ -99,15 +118,43 @@ void RichTextParser::put(char16_t character)
     }
     if (state_.destination == RichTextDestination::FontTable) {
         fonts_.current().family.append(QChar(character));
-    } else if (isShown()) {
+    } else if (!isShown()) {
+        noteHidden();
+    } else if (isPrivateSign(character)) {
+        putSign(character);
+    } else {
         beforeText();
         target_->append(character, format());
+    }
+}
+
+void RichTextParser::putSign(char16_t character)
+{
+    const char32_t known = characterOfSign(character, state_.signs);
+    notes_.signs += known == 0 ? 1 : 0;
+    beforeText();
+    if (known == 0) {
+        target_->append(character, format());
+    } else {
+        for (const char16_t unit : QChar::fromUcs4(known)) {
+            target_->append(unit, format());
+        }
+    }
+}
+
+/// Counts a hidden text once, however many pieces it is in.
+void RichTextParser::noteHidden()
+{
+    if (state_.destination == RichTextDestination::Body && !hiddenCounted_) {
+        hiddenCounted_ = true;
+        ++notes_.hidden;
     }
 }
 
 void RichTextParser::beforeText()
 {
     nestedRowEnded_ = false;
+    hiddenCounted_ = false;
     if (cellEnded_) {
         cellEnded_ = false;
         target_->append(u'\t', format());

@@ -23,7 +23,9 @@ void RichTextParser::readWord(const RichTextToken &token, bool isStarred)
         --fallback_;
         return;
     }
-    if (word == nullptr || (isStarred && !isDestination(word->action))) {
+    if (word == nullptr) {
+        // The mark says that who does not know the word leaves out the group. Before a word that is known and says nothing
+        // of its group, as that of a character style, it means nothing.
         if (isStarred) {
             skipGroup(nullptr);
         }
@@ -105,7 +107,11 @@ void RichTextParser::useFont(int font)
     }
     state_.characters.font = font;
     state_.format = -1;
-    const int page = font >= 0 ? fonts_[font].codePage : 0;
+    static const RichTextFont none;
+    const RichTextFont &used = font >= 0 ? fonts_[font] : none;
+    state_.signs = used.signs;
+    state_.hasSignBytes = used.hasSignBytes();
+    const int page = state_.hasSignBytes ? symbolCodePage : used.codePage;
     state_.codePage = &codePages_.page(page != 0 ? page : fileCodePage_);
 }
 

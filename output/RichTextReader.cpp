@@ -64,6 +64,8 @@ QStringList RichTextNotes::texts() const
     add(objects, Xlate("Embedded objects and drawings are not shown: %1."));
     add(footnotes, Xlate("Footnotes and comments are not shown: %1."));
     add(headers, Xlate("Page headers and footers are not shown: %1."));
+    add(hidden, Xlate("Hidden text is not shown: %1."));
+    add(signs, Xlate("Characters of symbol fonts are not known: %1."));
     return sentences;
 }
 

@@ -22,6 +22,8 @@ struct KAREPORT_EXPORT RichTextNotes
     int objects = 0;   ///< embedded or linked; the text that stands in for one is shown
     int footnotes = 0; ///< and endnotes and annotations
     int headers = 0;   ///< page headers and footers
+    int hidden = 0;    ///< texts that are marked as hidden
+    int signs = 0;     ///< characters of symbol fonts that are not known; they are shown as private characters
 
     /// A sentence for a person about each kind that was passed over; empty where all is shown.
     QStringList texts() const;
@@ -40,7 +42,8 @@ KAREPORT_EXPORT bool isRichText(QStringView text);
 
 /// Reads the bytes of a rich-text file (RTF) into a document, whose content is replaced. Bytes from 0x80 on are read in the
 /// code page of the current font, else of the file. What stands behind the end of the outermost group is not read.
-/// Headers, footers, notes, pictures and objects are passed over and counted in `notes`.
+/// Headers, footers, notes, pictures, objects and hidden text are passed over and counted in `notes`.
+/// The signs of the fonts Symbol and Wingdings become the characters that Unicode has for them.
 /// The document keeps no undo steps of what is read.
 /// @return what is wrong, the document then holds what was read up to there; nothing where all was read
 KAREPORT_EXPORT std::optional<RichTextError> readRichText(QByteArrayView bytes, QTextDocument &document,

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "RichTextCodePage.h"
+#include "RichTextSigns.h"
 
 #include <QList>
 #include <QTextFormat>
@@ -86,6 +87,8 @@ struct RichTextState
     RichTextParagraph paragraph;
     QTextOption::TabType nextTab = QTextOption::LeftTab;
     RichTextCodePage *codePage = nullptr;
+    const RichTextSigns *signs = nullptr; ///< of the font, where they are known
+    bool hasSignBytes = false;            ///< bytes are numbers of signs
     int fallbackCount = 1;
     RichTextDestination destination = RichTextDestination::Body;
     /// What holds again in the part of an ignored group that is to be read.

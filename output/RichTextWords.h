@@ -19,6 +19,7 @@ enum class RichTextAction
     PageBreak,
     SectionBreak,
     SamePage,
+    Style, ///< nothing: the words of its formats stand after it
     // Characters
     Plain,
     Font,

@@ -129,37 +129,54 @@ TEST(RichTextNotes, CountWhatIsNotShown)
     struct NoteRow
     {
         QByteArray bytes;
-        int pictures, objects, footnotes, headers;
+        QList<int> counts; ///< pictures, objects, footnotes, headers, hidden, signs
         QStringView text;
         const char *reason;
     };
     const NoteRow rows[] = {
-        {"a", 0, 0, 0, 0, u"a", "all is shown"},
-        {"{\\pict\\pngblip 89504e47}", 1, 0, 0, 0, u"", "a picture"},
-        {"{\\*\\shppict{\\pict 00}}{\\nonshppict{\\pict 00}}", 1, 0, 0, 0, u"", "a picture in two forms is one"},
-        {"{\\object\\objemb{\\*\\objclass C}{\\*\\objdata 00}{\\result shown}}", 0, 1, 0, 0, u"shown", "an object"},
-        {"{\\object{\\*\\objdata 00}hidden{\\result{\\pict 00}}}", 1, 1, 0, 0, u"", "an object with a picture"},
-        {"a{\\footnote\\pard\\chftn note}{\\*\\footnote x}{\\*\\annotation y}", 0, 0, 3, 0, u"a", "notes"},
-        {"{\\header h}{\\footerl\\pard{\\b f}}{\\headerf\\u8364?}{\\footer\\'b0}", 0, 0, 0, 4, u"", "of pages"},
-        {"{\\header\\pard\\par}{\\footer  }", 0, 0, 0, 0, u"", "nothing is lost with empty ones"},
-        {"{\\shp{\\*\\shpinst{\\shptxt t}}}", 0, 1, 0, 0, u"", "a drawing with text"},
-        {"{\\upr{{\\pict 00}}{\\*\\ud{{\\pict 00}}}}", 1, 0, 0, 0, u"", "of two forms one is read"},
+        {"a", {0, 0, 0, 0, 0, 0}, u"a", "all is shown"},
+        {"{\\pict\\pngblip 89504e47}", {1, 0, 0, 0, 0, 0}, u"", "a picture"},
+        {"{\\*\\shppict{\\pict 00}}{\\nonshppict{\\pict 00}}",
+         {1, 0, 0, 0, 0, 0},
+         u"",
+         "a picture in two forms is one"},
+        {"{\\object\\objemb{\\*\\objclass C}{\\*\\objdata 00}{\\result shown}}",
+         {0, 1, 0, 0, 0, 0},
+         u"shown",
+         "an object"},
+        {"{\\object{\\*\\objdata 00}hidden{\\result{\\pict 00}}}", {1, 1, 0, 0, 0, 0}, u"", "an object with a picture"},
+        {"a{\\footnote\\pard\\chftn note}{\\*\\footnote x}{\\*\\annotation y}", {0, 0, 3, 0, 0, 0}, u"a", "notes"},
+        {"{\\header h}{\\footerl\\pard{\\b f}}{\\headerf\\u8364?}{\\footer\\'b0}", {0, 0, 0, 4, 0, 0}, u"", "of pages"},
+        {"{\\header\\pard\\par}{\\footer  }", {0, 0, 0, 0, 0, 0}, u"", "nothing is lost with empty ones"},
+        {"{\\shp{\\*\\shpinst{\\shptxt t}}}", {0, 1, 0, 0, 0, 0}, u"", "a drawing with text"},
+        {"{\\upr{{\\pict 00}}{\\*\\ud{{\\pict 00}}}}", {1, 0, 0, 0, 0, 0}, u"", "of two forms one is read"},
+        {"a{\\v b}c", {0, 0, 0, 0, 1, 0}, u"ac", "hidden text"},
+        {"a{\\v b {\\b c}\\'e4\\u8364?\\par d}e", {0, 0, 0, 0, 1, 0}, u"ae", "in pieces it is one"},
+        {"a\\v b\\v0 c\\v d\\v0", {0, 0, 0, 0, 2, 0}, u"ac", "shown text parts it"},
+        {"a{\\v\\'e4}b{\\v\\u8364?}c{\\v\\{}d{\\v\\emdash}", {0, 0, 0, 0, 4, 0}, u"abcd", "of one character"},
+        {"\\ansicpg932 a{\\v\\'93\\'fa}", {0, 0, 0, 0, 1, 0}, u"a", "of one character in two bytes"},
+        {"a{\\v  \\par}b{\\v}c", {0, 0, 0, 0, 0, 0}, u"abc", "blanks and line ends are nothing that is missed"},
+        {"a{\\v{\\xe index}{\\*\\bkmkstart m}{\\pict 00}}", {1, 0, 0, 0, 0, 0}, u"a", "no text is hidden here"},
+        {"a{\\footnote{\\v b}}{\\info{\\v c}}", {0, 0, 1, 0, 0, 0}, u"a", "what is passed over as a whole"},
+        {"a\\u-3929?{\\v\\u-3929?}", {0, 0, 0, 0, 1, 1}, u"a\xF0A7", "a private character of no known font"},
     };
     for (const NoteRow &row : rows) {
         RichTextNotes notes;
         notes.pictures = 99;
         EXPECT_EQ(richtext::body(row.bytes, &notes), row.text) << row.reason;
-        EXPECT_EQ(notes.pictures, row.pictures) << row.reason;
-        EXPECT_EQ(notes.objects, row.objects) << row.reason;
-        EXPECT_EQ(notes.footnotes, row.footnotes) << row.reason;
-        EXPECT_EQ(notes.headers, row.headers) << row.reason;
+        EXPECT_EQ(
+            QList<int>({notes.pictures, notes.objects, notes.footnotes, notes.headers, notes.hidden, notes.signs}),
+            row.counts)
+            << row.reason;
     }
     EXPECT_EQ(RichTextNotes().texts(), QStringList());
-    const RichTextNotes all{.pictures = 1, .objects = 2, .footnotes = 3, .headers = 4};
+    const RichTextNotes all{.pictures = 1, .objects = 2, .footnotes = 3, .headers = 4, .hidden = 5, .signs = 6};
     EXPECT_EQ(all.texts(), QStringList({QStringLiteral("Pictures are not shown: 1."),
                                         QStringLiteral("Embedded objects and drawings are not shown: 2."),
                                         QStringLiteral("Footnotes and comments are not shown: 3."),
-                                        QStringLiteral("Page headers and footers are not shown: 4.")}));
+                                        QStringLiteral("Page headers and footers are not shown: 4."),
+                                        QStringLiteral("Hidden text is not shown: 5."),
+                                        QStringLiteral("Characters of symbol fonts are not known: 6.")}));
 }
 
 } // namespace

@@ -93,7 +93,7 @@ TEST(RichTextReader, ReadsUnicodeCharactersAndLeavesOutWhatStandsForThem)
     const Row rows[] = {
         {"\\u8364?x", u"€x", "one character for old readers"},
         {"\\u8364 ?x", u"€x", "a blank ends the word and is not counted"},
-        {"\\u-3913?", u"\xF0B7", "numbers are signed"},
+        {"\\u-3857?", u"\xF0EF", "numbers are signed"},
         {"\\u26085\\'93\\'fax", u"日\xFAx", "each byte is one"},
         {"\\uc2\\u26085\\'93\\'fax", u"日x", "two stand for it"},
         {"\\uc0\\u8364 x", u"€x", "nothing stands for it"},
@@ -146,7 +146,10 @@ TEST(RichTextReader, ReadsWhatGroupsAreFor)
         {"{\\info{\\title T}{\\author A}}{\\stylesheet{\\s0 Normal;}}{\\*\\generator G;}x", u"x", "about the file"},
         {"{\\*\\bkmkstart b}x{\\*\\bkmkend b}{\\xe{index}}{\\tc{contents}}", u"x", "marks in the text"},
         {"a{\\v hidden{\\par more}}b\\v c\\v0 d", u"abd", "hidden text is not shown"},
-        {"a{\\*\\b not shown}b", u"ab", "a word that should not be one of those has an unknown meaning"},
+        {"a{\\*\\cs13 b}c\\*\\cs0 d{\\i e\\*\\cs13 f}", u"abcd<i>ef", "a character style says nothing of its group"},
+        {"{\\*\\ts11 a}{\\*\\ds1 b}{\\*\\s2 c}", u"abc", "nor do the styles of tables, sections and paragraphs"},
+        {"a{\\*\\b b}c", u"a<b>b<>c", "nor does any word that is known and is not what a group is for"},
+        {"a{\\*\\pict 00}{\\*\\footnote b}c", u"ac", "what a group is for, with the mark or without"},
         {"a{\\*}b{\\* text}", u"ab text", "the mark without a word"},
     };
     expectBodies(rows);
