@@ -118,6 +118,8 @@ TEST(JobList, HasANameOnEachLine)
          {QString::fromUtf8("\xC3\xA4\xE7\xB7\x9A\xF0\x9F\x98\x80.json")},
          "names in UTF-8"},
         {QByteArray("a\nb.json\0c.json\0", 15), {"a\nb.json", "c.json"}, "names with a line end between 0 bytes"},
+        {QByteArray("a.json\0b.json", 13), {"a.json", "b.json"}, "no 0 byte behind the last"},
+        {QByteArray("a.json\0\n", 8), {"a.json"}, "a line end behind the last 0 byte"},
         {"#a.json\n", {"#a.json"}, "no comments: a name may begin so"},
     };
     const JobFolder folder;
@@ -126,6 +128,20 @@ TEST(JobList, HasANameOnEachLine)
         const auto jobs = kareport::readJobList(folder.path("jobs.txt"));
         ASSERT_EQ(kareport::errorOf(jobs), nullptr) << row.reason;
         EXPECT_EQ(std::get<QStringList>(jobs), row.expected) << row.reason;
+    }
+}
+
+TEST(JobList, ACharacter0InALineIsAnError)
+{
+    const JobFolder folder;
+    for (const QByteArray &content : {QByteArray("a.json\nb\0.json\nc.json\n", 22), QByteArray("a.json\nb\0.json", 14)})
+    {
+        folder.put("jobs.txt", content);
+        const auto jobs = kareport::readJobList(folder.path("jobs.txt"));
+        const auto *error = kareport::errorOf(jobs);
+        ASSERT_NE(error, nullptr) << "a name that would be parted";
+        EXPECT_EQ(placeText(error->place), QStringLiteral("2:2"));
+        EXPECT_TRUE(error->text.contains(u"lines and characters 0 as well")) << error->text.toStdString();
     }
 }
 

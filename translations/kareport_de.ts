@@ -254,6 +254,16 @@
         <translation>Kopf- und Fußzeilen werden nicht angezeigt: %1.</translation>
     </message>
     <message>
+        <location filename="../output/RichTextReader.cpp"/>
+        <source>Hidden text is not shown: %1.</source>
+        <translation>Verborgener Text wird nicht angezeigt: %1.</translation>
+    </message>
+    <message>
+        <location filename="../output/RichTextReader.cpp"/>
+        <source>Characters of symbol fonts are not known: %1.</source>
+        <translation>Zeichen aus Symbolschriften sind nicht bekannt: %1.</translation>
+    </message>
+    <message>
         <location filename="../report/ReportSaveName.cpp"/>
         <source>RTF Files (*.rtf)|*.rtf|Report Files (*.rep)|*.rep|PDF (*.pdf)|*.pdf|</source>
         <translation>RTF-Dateien (*.rtf)|*.rtf|Berichtsdateien (*.rep)|*.rep|PDF (*.pdf)|*.pdf|</translation>
@@ -671,8 +681,8 @@
     </message>
     <message>
         <location filename="../apps/kareport/CsvObjectList.cpp"/>
-        <source>the column "%1" stands twice: each variable was expected once</source>
-        <translation>die Spalte „%1“ kommt zweimal vor: jede Variable wurde nur einmal erwartet</translation>
+        <source>the columns %1 and %2 are both named "%3": each variable was expected once</source>
+        <translation>die Spalten %1 und %2 heißen beide „%3“: jede Variable wurde nur einmal erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvObjectList.cpp"/>
@@ -745,6 +755,11 @@
         <translation>die Liste der Aufträge kann nicht gelesen werden: %1</translation>
     </message>
     <message>
+        <location filename="../apps/kareport/JobList.cpp"/>
+        <source>the list of jobs has lines and characters 0 as well: names on lines, or each ended by a character 0, were expected</source>
+        <translation>die Liste der Aufträge hat Zeilen und auch Zeichen 0: Namen auf Zeilen, oder jeder mit einem Zeichen 0 beendet, wurden erwartet</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>one of %1 was expected</source>
         <translation>einer dieser Werte wurde erwartet: %1</translation>
@@ -758,6 +773,11 @@
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>a character code or a text of one character was expected</source>
         <translation>ein Zeichencode oder ein Text aus einem Zeichen wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobReader.cpp"/>
+        <source>a file name without a character 0 was expected</source>
+        <translation>ein Dateiname ohne das Zeichen 0 wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
@@ -906,6 +926,11 @@
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
+        <source>the key "%1" stands twice in "%2"</source>
+        <translation>der Schlüssel „%1“ kommt in „%2“ zweimal vor</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>the file cannot be read: %1</source>
         <translation>die Datei kann nicht gelesen werden: %1</translation>
     </message>
@@ -923,6 +948,16 @@
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>a JSON object was expected</source>
         <translation>ein JSON-Objekt wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JsonNode.cpp"/>
+        <source>the key "%1" stands in line %2 already: each key was expected once</source>
+        <translation>der Schlüssel „%1“ steht schon in Zeile %2: jeder Schlüssel wurde nur einmal erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JsonNode.cpp"/>
+        <source>the key "%1" has %2 steps: at most %3 were expected</source>
+        <translation>der Schlüssel „%1“ hat %2 Stufen: höchstens %3 wurden erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>

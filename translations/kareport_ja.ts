@@ -254,6 +254,16 @@
         <translation>ヘッダーとフッターは表示されません: %1 個。</translation>
     </message>
     <message>
+        <location filename="../output/RichTextReader.cpp"/>
+        <source>Hidden text is not shown: %1.</source>
+        <translation>隠し文字は表示されません: %1 個。</translation>
+    </message>
+    <message>
+        <location filename="../output/RichTextReader.cpp"/>
+        <source>Characters of symbol fonts are not known: %1.</source>
+        <translation>記号フォントの不明な文字: %1 個。</translation>
+    </message>
+    <message>
         <location filename="../report/ReportSaveName.cpp"/>
         <source>RTF Files (*.rtf)|*.rtf|Report Files (*.rep)|*.rep|PDF (*.pdf)|*.pdf|</source>
         <translation>RTF ファイル (*.rtf)|*.rtf|帳票ファイル (*.rep)|*.rep|PDF (*.pdf)|*.pdf|</translation>
@@ -671,8 +681,8 @@
     </message>
     <message>
         <location filename="../apps/kareport/CsvObjectList.cpp"/>
-        <source>the column "%1" stands twice: each variable was expected once</source>
-        <translation>列「%1」が 2 回あります: 変数はそれぞれ 1 回だけ指定できます</translation>
+        <source>the columns %1 and %2 are both named "%3": each variable was expected once</source>
+        <translation>列 %1 と列 %2 の名前がどちらも「%3」です: 変数はそれぞれ 1 回だけ指定できます</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CsvObjectList.cpp"/>
@@ -745,6 +755,11 @@
         <translation>ジョブの一覧を読み込めません: %1</translation>
     </message>
     <message>
+        <location filename="../apps/kareport/JobList.cpp"/>
+        <source>the list of jobs has lines and characters 0 as well: names on lines, or each ended by a character 0, were expected</source>
+        <translation>ジョブの一覧に改行と文字コード 0 が混在しています: 名前は 1 行に 1 つ、またはそれぞれ文字コード 0 で終わる必要があります</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>one of %1 was expected</source>
         <translation>次のいずれかが必要です: %1</translation>
@@ -758,6 +773,11 @@
         <location filename="../apps/kareport/JobReader.cpp"/>
         <source>a character code or a text of one character was expected</source>
         <translation>文字コードまたは 1 文字のテキストが必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobReader.cpp"/>
+        <source>a file name without a character 0 was expected</source>
+        <translation>文字コード 0 を含まないファイル名が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobReader.cpp"/>
@@ -906,6 +926,11 @@
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>
+        <source>the key "%1" stands twice in "%2"</source>
+        <translation>キー「%1」が「%2」に 2 回あります</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>the file cannot be read: %1</source>
         <translation>ファイルを読み込めません: %1</translation>
     </message>
@@ -923,6 +948,16 @@
         <location filename="../apps/kareport/JsonNode.cpp"/>
         <source>a JSON object was expected</source>
         <translation>JSON オブジェクトが必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JsonNode.cpp"/>
+        <source>the key "%1" stands in line %2 already: each key was expected once</source>
+        <translation>キー「%1」はすでに %2 行目にあります: キーはそれぞれ 1 回だけ指定できます</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JsonNode.cpp"/>
+        <source>the key "%1" has %2 steps: at most %3 were expected</source>
+        <translation>キー「%1」は %2 段階です: %3 段階までです</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JsonNode.cpp"/>

@@ -1,6 +1,7 @@
 #include "JobList.h"
 
 #include "FileBytes.h"
+#include "JsonPlaces.h"
 #include "Xlate.h"
 
 #include <QFile>
@@ -65,6 +66,14 @@ Expected<QStringList> readJobList(const QString &path)
         }
         const std::string_view view = std::get<std::shared_ptr<const FileBytes>>(file)->view();
         bytes = QByteArray(view.data(), static_cast<qsizetype>(view.size()));
+    }
+    // A character 0 inside a line would part its name, and neither half is the file that is meant.
+    const qsizetype lastZero = bytes.lastIndexOf('\0');
+    if (lastZero >= 0 && bytes.contains('\n') && !bytes.sliced(lastZero + 1).trimmed().isEmpty()) {
+        return InputError{
+            path == u"-" ? QString() : path, placeOfByte(bytes, bytes.indexOf('\0')),
+            Xlate("the list of jobs has lines and characters 0 as well: names on lines, or each ended by a "
+                  "character 0, were expected")};
     }
     const char separator = bytes.contains('\0') ? '\0' : '\n';
     QStringList jobs;
