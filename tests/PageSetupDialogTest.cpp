@@ -26,6 +26,7 @@ PageSetup usualSetup()
 {
     PageSetup setup;
     setup.margins = QMargins(1000, 1001, 1200, 2000);
+    setup.asksForPages = true;
     setup.sheetsOf = [](const QString &printer) {
         using kareport::PageSheet;
         const PageSheet a4{QStringLiteral("A4"), QSize(595, 842), QSizeF(210, 297)};
@@ -145,10 +146,82 @@ TEST(PageSetupDialog, EveryFieldIsReachedByALetterOfItsLabel)
         letters += button->text()[button->text().indexOf(u'&') + 1].toUpper();
     }
     EXPECT_EQ(buddies, 6);
-    EXPECT_EQ(letters.size(), 8);
+    EXPECT_EQ(letters.size(), 10);
     for (const QChar letter : letters) {
         EXPECT_EQ(letters.count(letter), 1) << QString(letter).toStdString();
     }
+}
+
+TEST(PageSetupDialog, ShowsWhichPagesApplyAndSwitchesThem)
+{
+    struct Row
+    {
+        std::optional<int> lines;
+        bool keeps;
+        const char *given; ///< what the choice says
+        bool canKeep;
+        bool isKept;
+        const char *reason;
+    };
+    const Row rows[] = {
+        {std::nullopt, false, "As the report was &made", false, false,
+         "a measured page: there is nothing to go back to"},
+        {std::nullopt, true, "As the report was &made", false, false, "nor when a host asks for it"},
+        {60, true, "As the report was &made (60 lines)", true, true, "the page of a job"},
+        {60, false, "As the report was &made (60 lines)", true, false, "a job's page that was switched off"},
+        {1, true, "As the report was &made (1 line)", true, true, "a line is one line"},
+    };
+    for (const Row &row : rows) {
+        PageSetup setup = usualSetup();
+        setup.givenLines = row.lines;
+        setup.keepsGivenPages = row.keeps;
+        PageSetupDialog dialog(setup);
+        dialog.show();
+        QRadioButton *given = choice(dialog, row.given);
+        QRadioButton *measured = choice(dialog, "As the &sheet takes them");
+        ASSERT_NE(given, nullptr) << row.reason;
+        ASSERT_NE(measured, nullptr) << row.reason;
+        EXPECT_EQ(given->accessibleName(), QStringLiteral("Pages: ") + QString::fromUtf8(row.given).remove(u'&'));
+        EXPECT_FALSE(given->accessibleDescription().isEmpty()) << row.reason;
+        EXPECT_EQ(given->isChecked(), row.isKept) << row.reason;
+        EXPECT_EQ(measured->isChecked(), !row.isKept) << row.reason;
+        EXPECT_EQ(dialog.setup().keepsGivenPages, row.isKept) << row.reason;
+        EXPECT_EQ(dialog.setup().givenLines, row.lines) << row.reason;
+
+        QTest::mouseClick(row.isKept ? measured : given, Qt::LeftButton);
+        EXPECT_EQ(dialog.setup().keepsGivenPages, row.canKeep && !row.isKept) << "clicked; " << row.reason;
+        QTest::mouseClick(row.isKept ? given : measured, Qt::LeftButton);
+        EXPECT_EQ(dialog.setup().keepsGivenPages, row.isKept) << "and back; " << row.reason;
+        EXPECT_TRUE(choice(dialog, "P&ortrait")->isChecked()) << "the orientation is another choice; " << row.reason;
+    }
+}
+
+TEST(PageSetupDialog, WithoutAReportNobodyIsAskedForItsPages)
+{
+    PageSetup setup = usualSetup();
+    setup.asksForPages = false;
+    PageSetupDialog dialog(setup);
+    dialog.show();
+    EXPECT_FALSE(choice(dialog, "As the &sheet takes them")->isVisible());
+}
+
+TEST(PageSetupDialog, PagesAreSwitchedWithTheKeyboard)
+{
+    PageSetup setup = usualSetup();
+    setup.givenLines = 60;
+    setup.keepsGivenPages = true;
+    PageSetupDialog dialog(setup);
+    dialog.show();
+    ASSERT_TRUE(QTest::qWaitForWindowExposed(&dialog));
+    QTest::keyClick(&dialog, Qt::Key_S, Qt::AltModifier);
+    EXPECT_FALSE(dialog.setup().keepsGivenPages);
+    QTest::keyClick(&dialog, Qt::Key_M, Qt::AltModifier);
+    EXPECT_TRUE(dialog.setup().keepsGivenPages);
+    field(dialog, "Bottom margin")->setFocus();
+    QTest::keyClick(dialog.focusWidget(), Qt::Key_Tab);
+    EXPECT_EQ(dialog.focusWidget(), choice(dialog, "As the report was &made (60 lines)")) << "below the margins";
+    QTest::keyClick(dialog.focusWidget(), Qt::Key_Down);
+    EXPECT_FALSE(dialog.setup().keepsGivenPages);
 }
 
 TEST(PageSetupDialog, RefusesMarginsThatLeaveNoRoomAndSaysSo)

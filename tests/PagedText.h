@@ -48,7 +48,7 @@ public:
     std::vector<qint64> starts(const QRect &page)
     {
         std::vector<qint64> found = {0};
-        const kareport::LinePager pages = pager();
+        kareport::LinePager pages = pager();
         for (;;) {
             const qint64 next = pages.layOut(page, found.back(), -1);
             if (next >= pages.length() || next <= found.back()) {

@@ -61,8 +61,10 @@ public:
         while (timer.elapsed() < 30'000 && jobs() != 0) {
             QThread::msleep(50);
         }
-        return pagesIn(folder_.filePath(QStringLiteral("arrived/job.pdf")));
+        return pagesIn(arrived());
     }
+    /// The last job that has arrived.
+    QString arrived() const { return folder_.filePath(QStringLiteral("arrived/job.pdf")); }
     /// The jobs that wait or are printed.
     int jobs()
     {

@@ -394,6 +394,21 @@
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
+        <source>As the report was &amp;made</source>
+        <translation>Wie im Bericht an&amp;gelegt</translation>
+    </message>
+    <message>
+        <location filename="../view/PageSetupForm.cpp"/>
+        <source>As the report was &amp;made (1 line)</source>
+        <translation>Wie im Bericht an&amp;gelegt (1 Zeile)</translation>
+    </message>
+    <message>
+        <location filename="../view/PageSetupForm.cpp"/>
+        <source>As the report was &amp;made (%1 lines)</source>
+        <translation>Wie im Bericht an&amp;gelegt (%1 Zeilen)</translation>
+    </message>
+    <message>
+        <location filename="../view/PageSetupForm.cpp"/>
         <source>P&amp;ortrait</source>
         <translation>&amp;Hochformat</translation>
     </message>
@@ -401,6 +416,11 @@
         <location filename="../view/PageSetupForm.cpp"/>
         <source>L&amp;andscape</source>
         <translation>&amp;Querformat</translation>
+    </message>
+    <message>
+        <location filename="../view/PageSetupForm.cpp"/>
+        <source>As the &amp;sheet takes them</source>
+        <translation>Wie sie auf das &amp;Blatt passen</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
@@ -476,6 +496,21 @@
         <location filename="../view/PageSetupForm.cpp"/>
         <source> mm</source>
         <translation> mm</translation>
+    </message>
+    <message>
+        <location filename="../view/PageSetupForm.cpp"/>
+        <source>Pages: %1</source>
+        <translation>Seiten: %1</translation>
+    </message>
+    <message>
+        <location filename="../view/PageSetupForm.cpp"/>
+        <source>Each page of the report is printed on a sheet of its own, in smaller type where it has to be.</source>
+        <translation>Jede Seite des Berichts wird auf ein eigenes Blatt gedruckt, wo nötig in kleinerer Schrift.</translation>
+    </message>
+    <message>
+        <location filename="../view/PageSetupForm.cpp"/>
+        <source>Each sheet takes as many lines as fit, and the next sheet goes on from there.</source>
+        <translation>Jedes Blatt nimmt so viele Zeilen auf, wie darauf passen, und das nächste fährt dort fort.</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>

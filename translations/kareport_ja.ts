@@ -394,6 +394,21 @@
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
+        <source>As the report was &amp;made</source>
+        <translation>作成時のページのまま(&amp;M)</translation>
+    </message>
+    <message>
+        <location filename="../view/PageSetupForm.cpp"/>
+        <source>As the report was &amp;made (1 line)</source>
+        <translation>作成時のページのまま (1 行)(&amp;M)</translation>
+    </message>
+    <message>
+        <location filename="../view/PageSetupForm.cpp"/>
+        <source>As the report was &amp;made (%1 lines)</source>
+        <translation>作成時のページのまま (%1 行)(&amp;M)</translation>
+    </message>
+    <message>
+        <location filename="../view/PageSetupForm.cpp"/>
         <source>P&amp;ortrait</source>
         <translation>縦(&amp;O)</translation>
     </message>
@@ -401,6 +416,11 @@
         <location filename="../view/PageSetupForm.cpp"/>
         <source>L&amp;andscape</source>
         <translation>横(&amp;A)</translation>
+    </message>
+    <message>
+        <location filename="../view/PageSetupForm.cpp"/>
+        <source>As the &amp;sheet takes them</source>
+        <translation>用紙に入る行数で区切る(&amp;S)</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>
@@ -476,6 +496,21 @@
         <location filename="../view/PageSetupForm.cpp"/>
         <source> mm</source>
         <translation> mm</translation>
+    </message>
+    <message>
+        <location filename="../view/PageSetupForm.cpp"/>
+        <source>Pages: %1</source>
+        <translation>ページ: %1</translation>
+    </message>
+    <message>
+        <location filename="../view/PageSetupForm.cpp"/>
+        <source>Each page of the report is printed on a sheet of its own, in smaller type where it has to be.</source>
+        <translation>レポートの各ページを 1 枚ずつの用紙に印刷します。入りきらない場合は文字を小さくします。</translation>
+    </message>
+    <message>
+        <location filename="../view/PageSetupForm.cpp"/>
+        <source>Each sheet takes as many lines as fit, and the next sheet goes on from there.</source>
+        <translation>各用紙に入るだけの行を印刷し、続きを次の用紙に印刷します。</translation>
     </message>
     <message>
         <location filename="../view/PageSetupForm.cpp"/>

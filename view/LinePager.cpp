@@ -1,7 +1,6 @@
 #include "LinePager.h"
 
 #include "PageRows.h"
-#include "PrintFaces.h"
 #include "PrintGeometry.h"
 
 #include <QPaintDevice>
@@ -21,10 +20,17 @@ namespace
 /// What the conversions of a sheet and its margins may take from a length: two margins rounded twice, the sheet cut off.
 constexpr qreal lostTwips = 2;
 constexpr qreal lostDots = 1;
+constexpr qreal pointsPerInch = 72;
 
 qreal dotsOf(int twips, int resolution)
 {
     return qreal(twips) * resolution / twipsPerInch;
+}
+
+/// What roundings may have taken from a height.
+qreal roundingOf(int resolution)
+{
+    return dotsOf(1, resolution) * lostTwips + lostDots;
 }
 
 /// The height of a page of `lines` lines where roundings are all that keeps it from them.
@@ -38,29 +44,64 @@ qreal settledHeight(qreal height, int lineHeight, int lines, qreal rounding)
 
 } // namespace
 
-LinePager::LinePager(const QTextDocument &text, QPaintDevice &device) : text_(text), device_(device) {}
+LinePager::LinePager(const QTextDocument &text, QPaintDevice &device)
+    : text_(text), device_(device), faces_(text, device)
+{}
 
 qint64 LinePager::length() const
 {
     return text_.characterCount() - 1;
 }
 
-qint64 LinePager::layOut(const QRect &twips, qint64 start, qint64 stop, QPainter *painter) const
+SheetRoom LinePager::room(const QRect &twips) const
+{
+    const qreal rounding = roundingOf(device_.logicalDpiY());
+    return {dotsOf(twips.width(), device_.logicalDpiX()) + rounding,
+            dotsOf(twips.height(), device_.logicalDpiY()) + rounding};
+}
+
+qint64 LinePager::layOut(const QRect &twips, qint64 start, qint64 stop, QPainter *painter)
 {
     const qint64 end = stop < 0 ? length() : std::min(stop, length());
     if (start < 0 || start >= end || twips.isEmpty()) {
         return start;
     }
     const int resolution = device_.logicalDpiY();
-    const qreal rounding = dotsOf(1, resolution) * lostTwips + lostDots;
-    PrintFaces faces(text_, device_);
     PageArea area;
     area.left = std::round(dotsOf(twips.x(), device_.logicalDpiX()));
     area.top = std::round(dotsOf(twips.y(), resolution));
-    area.width = dotsOf(twips.width(), device_.logicalDpiX()) + rounding;
-    area.height = settledHeight(dotsOf(twips.height(), resolution), faces.base().height, usualLines_, rounding);
+    area.width = room(twips).width;
+    area.height =
+        settledHeight(dotsOf(twips.height(), resolution), faces_.base().height, usualLines_, roundingOf(resolution));
+    return layOutIn(area, start, end, painter);
+}
 
-    PageRows rows(text_, faces, device_, area, painter);
+qint64 LinePager::layOutScaled(const QRect &twips, qint64 start, qint64 stop, qreal scale, QPainter *painter)
+{
+    const qint64 end = stop < 0 ? length() : std::min(stop, length());
+    if (start < 0 || start >= end || twips.isEmpty() || scale <= 0) {
+        return start;
+    }
+    // In dots of the type's own size, so that rows break and stand at every size as they do at this one.
+    const SheetRoom sheet = room(twips);
+    PageArea area;
+    area.width = sheet.width / scale + lostDots;
+    area.height = sheet.height / scale + lostDots;
+    if (painter == nullptr) {
+        return layOutIn(area, start, end, nullptr);
+    }
+    painter->save();
+    painter->translate(std::round(dotsOf(twips.x(), device_.logicalDpiX())),
+                       std::round(dotsOf(twips.y(), device_.logicalDpiY())));
+    painter->scale(scale, scale);
+    const qint64 next = layOutIn(area, start, end, painter);
+    painter->restore();
+    return next;
+}
+
+qint64 LinePager::layOutIn(const PageArea &area, qint64 start, qint64 end, QPainter *painter)
+{
+    PageRows rows(text_, faces_, device_, area, painter);
     QTextBlock block = text_.findBlock(static_cast<int>(start));
     qint64 next = start;
     while (next < end) {
@@ -73,6 +114,25 @@ qint64 LinePager::layOut(const QRect &twips, qint64 start, qint64 stop, QPainter
         next = block.isValid() ? block.position() : end;
     }
     return std::min(next, end);
+}
+
+PageText LinePager::measure(qint64 start, qint64 stop)
+{
+    PageText page;
+    const int resolution = device_.logicalDpiY();
+    page.points = static_cast<double>(faces_.base().font.pixelSize()) * pointsPerInch / resolution;
+    PageRows rows(text_, faces_, device_, PageArea(), nullptr);
+    qreal height = 0;
+    for (QTextBlock block = text_.findBlock(static_cast<int>(start)); block.isValid() && block.position() < stop;
+         block = block.next())
+    {
+        const PageRows::LineSize line = rows.measureLine(block);
+        page.widestRow = std::max(page.widestRow, line.width);
+        height += line.height;
+        ++page.rows;
+    }
+    page.rowHeight = page.rows > 0 ? height / static_cast<double>(page.rows) : 0;
+    return page;
 }
 
 } // namespace kareport

@@ -19,6 +19,8 @@ namespace
 
 /// A line without end is laid out so many characters at a time, or each page of it would cost the whole line.
 constexpr int pieceLength = 2000;
+/// Wider, in dots, than such a piece.
+constexpr qreal unbroken = 4e6;
 
 /// Characters that stand side by side as they come: no tab, nothing that combines or runs from right to left.
 bool isPlain(char16_t character)
@@ -203,13 +205,56 @@ void PageRows::prepare(QTextLayout &layout, int from, int stop) const
     layout.setFormats(formats);
 }
 
+int PageRows::endOfPiece(int from, int stop) const
+{
+    const int end = std::min(stop, from + pieceLength);
+    return end < stop && line_[end].isLowSurrogate() ? end - 1 : end;
+}
+
+qreal PageRows::wholeWidth() const
+{
+    qreal widest = 0;
+    qreal width = 0; // of the row at hand, which may take several pieces
+    const auto stop = static_cast<int>(line_.size());
+    for (int from = 0, end = 0; from < stop; from = end) {
+        end = endOfPiece(from, stop);
+        QTextLayout layout(line_.mid(from, end - from), runs_.front().face->font, &device_);
+        prepare(layout, from, end);
+        layout.beginLayout();
+        for (QTextLine row = layout.createLine(); row.isValid(); row = layout.createLine()) {
+            width = row.textStart() > 0 ? 0 : width;
+            row.setLineWidth(unbroken);
+            width += row.naturalTextWidth();
+            widest = std::max(widest, width);
+        }
+        layout.endLayout();
+    }
+    return widest;
+}
+
+PageRows::LineSize PageRows::measureLine(const QTextBlock &block)
+{
+    line_ = block.text();
+    auto stop = static_cast<int>(line_.size());
+    readRuns(block, 0, stop);
+    const auto rows = static_cast<int>(line_.count(QChar::LineSeparator)) + 1;
+    const int height = extents(0, stop).height * rows;
+    // Blanks at a line's end may stand in the margin.
+    while (stop > 0 && line_[stop - 1] == u' ') {
+        --stop;
+    }
+    if (stop < line_.size()) {
+        line_.truncate(stop);
+        readRuns(block, 0, stop);
+    }
+    const qreal width = plainWidth();
+    return {width < 0 ? wholeWidth() : width, height};
+}
+
 int PageRows::addWrapped(int from, int stop)
 {
     while (from < stop) {
-        int pieceEnd = std::min(stop, from + pieceLength);
-        if (pieceEnd < stop && line_[pieceEnd].isLowSurrogate()) {
-            --pieceEnd;
-        }
+        const int pieceEnd = endOfPiece(from, stop);
         QTextLayout layout(line_.mid(from, pieceEnd - from), runs_.front().face->font, &device_);
         prepare(layout, from, pieceEnd);
         layout.beginLayout();

@@ -38,6 +38,13 @@ public:
     /// Adds the characters `from` to `stop` of a line. @return the first that did not fit; `stop` with `isFull` false when
     /// all did
     int addLine(const QTextBlock &block, int from, int stop);
+    /// The size of a line that nothing breaks.
+    struct LineSize
+    {
+        qreal width;
+        int height;
+    };
+    LineSize measureLine(const QTextBlock &block);
     /// Whether the last row did not fit.
     bool isFull() const { return full_; }
 
@@ -53,6 +60,9 @@ private:
     void readRuns(const QTextBlock &block, int from, int stop);
     /// The width of a line that can be drawn without laying it out; below 0 for one that cannot.
     qreal plainWidth() const;
+    /// The width of any line.
+    qreal wholeWidth() const;
+    int endOfPiece(int from, int stop) const;
     bool reserve(int height);
     /// What the characters from `from` to before `stop` take above their baseline and in all.
     struct Extents

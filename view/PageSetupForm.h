@@ -10,12 +10,14 @@
 
 #include <array>
 #include <functional>
+#include <optional>
 #include <vector>
 
 class QComboBox;
 class QDoubleSpinBox;
 class QLabel;
 class QRadioButton;
+class QVBoxLayout;
 
 namespace kareport
 {
@@ -36,11 +38,17 @@ struct PageSetup
     QString printer;      ///< empty for the built-in page device
     QStringList printers; ///< to choose from
     QSize sheet;          ///< upright, in points; empty for the printer's own
+    /// Whether there is a report to ask for its pages.
+    bool asksForPages = false;
+    /// The lines of the page that the report was made for; nothing for a report whose page has only been measured.
+    std::optional<int> givenLines;
+    /// Whether each of those pages is printed on a sheet of its own, or as many lines on a sheet as it takes.
+    bool keepsGivenPages = false;
     /// The sheets that a printer takes, its own first.
     std::function<std::vector<PageSheet>(const QString &printer)> sheetsOf;
 };
 
-/// Asks for paper, orientation, margins and, where there are several, the printer.
+/// Asks for paper, orientation, margins, what a page is and, where there are several, the printer.
 class KAREPORT_EXPORT PageSetupForm : public QWidget
 {
 public:
@@ -52,6 +60,10 @@ public:
     bool confirm();
 
 private:
+    void addPrinter(QVBoxLayout &layout);
+    void addOrientation(QVBoxLayout &layout);
+    void addMargins(QVBoxLayout &layout);
+    void addPages(QVBoxLayout &layout);
     bool leavesRoom() const;
     const PageSheet *chosenSheet() const; ///< null when nothing is known of the printer's sheets
     void fillSheets();
@@ -66,6 +78,8 @@ private:
     QWidget *paperRow_;
     std::vector<PageSheet> sheets_; ///< of the chosen printer
     QLabel *sheet_;
+    QRadioButton *givenPages_;
+    QRadioButton *measuredPages_;
     QLabel *warning_;
     std::array<QDoubleSpinBox *, 4> margins_ = {}; ///< left, top, right, bottom
 };

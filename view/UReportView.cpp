@@ -1,5 +1,6 @@
 #include "UReportView.h"
 
+#include "PrintRun.h"
 #include "ReportChange.h"
 #include "ReportContent.h"
 #include "ReportEdit.h"

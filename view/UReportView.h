@@ -24,6 +24,8 @@ namespace kareport
 class LinePager;
 class ReportEdit;
 class ReportViewWidget;
+struct PrintRun;
+struct PrintSheet;
 struct ReportChange;
 
 /// A print job as the view sees it.
@@ -90,8 +92,10 @@ public:
     void OnReportPrint(bool direct = false);
     void OnReportPrintPreview();
     void OnPageSetup();
-    /// Prepares a job: page count, margins, paper, printer. @return false cancels it
+    /// Prepares a job: page count, margins, paper, printer. A report whose page was given has the sheets that its pages take
+    /// for pages. @return false cancels it
     bool OnPreparePrinting(kareport::PrintInfo &info);
+    /// Begins the table of page starts: with the first page, or with all sheets of a report whose page was given.
     void OnBeginPrinting(QPainter &painter, kareport::PrintInfo &info);
     void OnEndPrinting(QPainter &painter, kareport::PrintInfo &info);
     void OnPrepareDC(QPainter &painter, kareport::PrintInfo &info);
@@ -112,7 +116,13 @@ private:
     void WrapChanged();
     void noteMirrored();
     QRect printableRect() const; ///< twips
-    kareport::LinePager makePager(QPaintDevice &device) const;
+    std::unique_ptr<kareport::PrintRun> makeRun(QPaintDevice &device) const;
+    /// The sheets of a report whose page was given; empty where the lines flow from sheet to sheet.
+    std::vector<kareport::PrintSheet> givenSheets(kareport::LinePager &pager) const;
+    /// Does something with a pager for a device: the one of the job, where it is about that device.
+    template <typename Work>
+    qint64 withPager(QPaintDevice &device, Work work) const;
+    bool printsGivenPages() const;
     std::vector<kareport::Command> makeCommands();
     void takeEdit(const kareport::ReportChange &change);
     void followEdit(const kareport::ReportChange &change);
@@ -127,4 +137,5 @@ private:
     QMargins m_rectMargin;      ///< twips
     QSize m_sizePaper;          ///< twips
     std::vector<qint64> m_aPageStart;
+    std::unique_ptr<kareport::PrintRun> run_; ///< of the job at hand
 };

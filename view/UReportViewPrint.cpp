@@ -1,12 +1,12 @@
 #include "UReportView.h"
 
 #include "AppMessageBox.h"
-#include "LinePager.h"
 #include "MarginPicture.h"
 #include "Preferences.h"
 #include "PrintDialogs.h"
 #include "PrintGeometry.h"
 #include "PrintJob.h"
+#include "PrintRun.h"
 #include "ReportEdit.h"
 #include "ReportPrinter.h"
 #include "ReportViewWidget.h"
@@ -209,6 +209,10 @@ bool UReportView::OnPreparePrinting(PrintInfo &info)
             return false;
         }
     }
+    if (report->IsPageFixed()) {
+        const std::size_t sheets = makeRun(*info.printer)->sheets.size();
+        info.maxPage = sheets > 0 ? static_cast<int>(sheets) : info.maxPage;
+    }
     if (info.preview) {
         return true;
     }
@@ -228,23 +232,36 @@ bool UReportView::OnPreparePrinting(PrintInfo &info)
     return true;
 }
 
-void UReportView::OnBeginPrinting(QPainter & /*painter*/, PrintInfo & /*info*/)
+void UReportView::OnBeginPrinting(QPainter &painter, PrintInfo &info)
 {
     m_aPageStart.assign(1, 0);
+    run_ = painter.device() == nullptr ? nullptr : makeRun(*painter.device());
+    if (!printsGivenPages()) {
+        return;
+    }
+    m_aPageStart.clear();
+    for (const kareport::PrintSheet &sheet : run_->sheets) {
+        m_aPageStart.push_back(sheet.start);
+    }
+    info.maxPage = static_cast<int>(m_aPageStart.size());
 }
 
 void UReportView::OnEndPrinting(QPainter & /*painter*/, PrintInfo & /*info*/)
 {
     m_aPageStart.clear();
+    run_.reset();
 }
 
 void UReportView::OnPrepareDC(QPainter &painter, PrintInfo &info)
 {
     // A page may be asked for before the pages in front of it have been printed.
     while (!m_aPageStart.empty() && static_cast<qint64>(m_aPageStart.size()) < info.curPage) {
-        const kareport::LinePager pager = makePager(*painter.device());
-        const qint64 next = pager.layOut(printableRect(), m_aPageStart.back(), -1);
-        if (next >= pager.length() || next <= m_aPageStart.back()) {
+        qint64 length = 0;
+        const qint64 next = withPager(*painter.device(), [&](kareport::LinePager &pager) {
+            length = pager.length();
+            return printsGivenPages() ? length : pager.layOut(printableRect(), m_aPageStart.back(), -1);
+        });
+        if (next >= length || next <= m_aPageStart.back()) {
             info.maxPage = static_cast<int>(m_aPageStart.size());
             return;
         }
@@ -258,7 +275,16 @@ void UReportView::OnPrint(QPainter &painter, PrintInfo &info)
     if (info.curPage < 1 || info.curPage > pages) {
         throw std::invalid_argument("the start of the page is not known");
     }
-    const qint64 start = m_aPageStart[static_cast<std::size_t>(info.curPage) - 1];
+    const auto index = static_cast<std::size_t>(info.curPage) - 1;
+    if (printsGivenPages()) {
+        const kareport::PrintSheet sheet = run_->sheets.at(index);
+        withPager(*painter.device(), [&](kareport::LinePager &pager) {
+            return pager.layOutScaled(printableRect(), sheet.start, sheet.stop, sheet.scale, &painter);
+        });
+        info.maxPage = static_cast<int>(pages);
+        return;
+    }
+    const qint64 start = m_aPageStart[index];
     const qint64 next = PrintPage(painter, start, -1);
     if (next >= GetEdit().document()->characterCount() - 1) {
         info.maxPage = info.curPage;
@@ -269,8 +295,11 @@ void UReportView::OnPrint(QPainter &painter, PrintInfo &info)
 
 qint64 UReportView::PrintPage(QPainter &painter, qint64 start, qint64 stop)
 {
-    return painter.device() == nullptr ? start
-                                       : makePager(*painter.device()).layOut(printableRect(), start, stop, &painter);
+    if (painter.device() == nullptr) {
+        return start;
+    }
+    return withPager(*painter.device(),
+                     [&](kareport::LinePager &pager) { return pager.layOut(printableRect(), start, stop, &painter); });
 }
 
 void UReportView::DrawMargins(QPainter &painter)
@@ -283,11 +312,43 @@ QRect UReportView::printableRect() const
     return kareport::printableRect(m_sizePaper, m_rectMargin);
 }
 
-kareport::LinePager UReportView::makePager(QPaintDevice &device) const
+std::unique_ptr<kareport::PrintRun> UReportView::makeRun(QPaintDevice &device) const
 {
-    kareport::LinePager pager(*GetEdit().document(), device);
+    auto run = std::make_unique<kareport::PrintRun>(*GetEdit().document(), device);
+    run->pager.setUsualLines(GetDocument() == nullptr ? 0 : GetDocument()->GetLinesPerPage());
+    run->sheets = givenSheets(run->pager);
+    return run;
+}
+
+std::vector<kareport::PrintSheet> UReportView::givenSheets(kareport::LinePager &pager) const
+{
+    const UReportDoc *report = GetDocument();
+    if (report == nullptr || !report->IsPageFixed()) {
+        return {};
+    }
+    // The pages of what is shown: formats and line ends make the places of characters differ from those in the report.
+    const QString shown = pager.text().toPlainText();
+    const int lines = report->GetLinesPerPage();
+    return kareport::printSheets(
+        pager, printableRect(),
+        kareport::reportPages(shown, kareport::startsOfLines(shown, report->GetPageStartLines()), lines), lines);
+}
+
+bool UReportView::printsGivenPages() const
+{
+    return run_ != nullptr && !run_->sheets.empty();
+}
+
+template <typename Work>
+qint64 UReportView::withPager(QPaintDevice &device, Work work) const
+{
+    QTextDocument &text = *GetEdit().document();
+    if (run_ != nullptr && run_->isFor(text, device)) {
+        return work(run_->pager);
+    }
+    kareport::LinePager pager(text, device);
     pager.setUsualLines(GetDocument() == nullptr ? 0 : GetDocument()->GetLinesPerPage());
-    return pager;
+    return work(pager);
 }
 
 void UReportView::OnPageSetup()
@@ -304,6 +365,9 @@ void UReportView::OnPageSetup()
     kareport::PageSetup setup;
     setup.margins = report->GetMargins();
     setup.portrait = UPreviewDlg::IsModulePrinterOrientationPortrait();
+    setup.asksForPages = true;
+    setup.givenLines = report->GetGivenLinesPerPage();
+    setup.keepsGivenPages = report->IsPageFixed();
     kareport::fillPrinters(setup);
     const PrintedText text(*this);
     if (!kareport::askPageSetup(setup, GetWidget()) || !text.isOpen()) {
@@ -312,6 +376,7 @@ void UReportView::OnPageSetup()
     UPreviewDlg::SetModulePrinterOrientationPortrait(setup.portrait);
     kareport::selectPrinter(setup.printer, setup.sheet);
     report->SetMargins(setup.margins);
+    report->UseGivenPage(setup.keepsGivenPages);
     report->SetPageSize();
     report->SaveSettings();
     static_cast<kareport::ReportViewWidget *>(GetWidget())->showPlace();

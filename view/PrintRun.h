@@ -1,0 +1,34 @@
+#pragma once
+
+#include "LinePager.h"
+#include "PrintSheets.h"
+
+#include <QPaintDevice>
+#include <QPointer>
+#include <QTextDocument>
+
+#include <vector>
+
+namespace kareport
+{
+
+/// What is found out once for all sheets of a job.
+struct PrintRun
+{
+    PrintRun(QTextDocument &text, QPaintDevice &device)
+        : document(&text), revision(text.revision()), pager(text, device)
+    {}
+
+    /// Whether it is about this text as it is now, on this device.
+    bool isFor(const QTextDocument &text, const QPaintDevice &device) const
+    {
+        return document == &text && revision == text.revision() && &pager.device() == &device;
+    }
+
+    QPointer<QTextDocument> document;
+    int revision;
+    LinePager pager;
+    std::vector<PrintSheet> sheets; ///< empty where the lines flow from sheet to sheet
+};
+
+} // namespace kareport
