@@ -149,11 +149,11 @@ int UReportDoc::SetPageSize()
     }
     geometry_.pageSize = device->size;
     geometry_.resolution = static_cast<unsigned>(device->resolution);
-    if (!fixedLinesPerPage_ || !fixedCharsPerRow_) {
+    if (!IsPageFixed() || !fixedCharsPerRow_) {
         geometry_ =
             kareport::measurePage(*device, margins_, kareport::measureFont(fontName_, fontSize_, device->resolution));
     }
-    FixPage(fixedLinesPerPage_, fixedCharsPerRow_);
+    applyGivenPage();
     return 1;
 }
 
@@ -161,8 +161,21 @@ void UReportDoc::FixPage(std::optional<int> linesPerPage, std::optional<int> cha
 {
     fixedLinesPerPage_ = linesPerPage;
     fixedCharsPerRow_ = charsPerRow;
-    geometry_.linesPerPage = linesPerPage.value_or(geometry_.linesPerPage);
-    geometry_.charsPerRow = charsPerRow.value_or(geometry_.charsPerRow);
+    UseGivenPage(true);
+}
+
+void UReportDoc::UseGivenPage(bool on)
+{
+    usesGivenPage_ = on;
+    applyGivenPage();
+}
+
+void UReportDoc::applyGivenPage()
+{
+    if (IsPageFixed()) {
+        geometry_.linesPerPage = *fixedLinesPerPage_;
+    }
+    geometry_.charsPerRow = fixedCharsPerRow_.value_or(geometry_.charsPerRow);
     page_.setLinesPerPage(geometry_.linesPerPage);
 }
 

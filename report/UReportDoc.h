@@ -141,8 +141,13 @@ public:
     /// Fixes the lines of a page or the characters of a row (1 or more), whatever is measured; with both, no font is
     /// measured. What is not given is measured again by the next `SetPageSize`.
     void FixPage(std::optional<int> linesPerPage, std::optional<int> charsPerRow);
-    /// Whether the lines of a page were given by `FixPage`, and are not measured.
-    bool IsPageFixed() const { return fixedLinesPerPage_.has_value(); }
+    /// Whether the lines of a page are those given to `FixPage`, and not measured.
+    bool IsPageFixed() const { return usesGivenPage_ && fixedLinesPerPage_.has_value(); }
+    /// Switches between the lines of a page that were given and those that are measured, which the next `SetPageSize` does.
+    /// `FixPage` switches back to the given ones.
+    void UseGivenPage(bool on);
+    /// The lines of a page that were given to `FixPage`, whether they count or not.
+    std::optional<int> GetGivenLinesPerPage() const { return fixedLinesPerPage_; }
 
     /// Whether the text is the source of a rich-text document, which is shown in its place.
     bool HoldsRichTextSource() const;
@@ -358,6 +363,7 @@ private:
 
     kareport::FormatOptions formatOptions() const;
     kareport::RichTextImage::Form imageForm() const;
+    void applyGivenPage();
     bool saveByName(const QString &path);
     bool saveText(const QString &path);
     std::optional<bool> saveViewAsRichText(const QString &path);
@@ -392,6 +398,7 @@ private:
     kareport::PageWriter page_;
     kareport::PageGeometry geometry_;
     std::optional<int> fixedLinesPerPage_;
+    bool usesGivenPage_ = true;
     std::optional<int> fixedCharsPerRow_;
     QMargins margins_ = {1000, 1000, 1200, 2000};
     QString title_;

@@ -212,11 +212,13 @@ TEST(PageSetupDialog, PagesAreSwitchedWithTheKeyboard)
     setup.keepsGivenPages = true;
     PageSetupDialog dialog(setup);
     dialog.show();
-    ASSERT_TRUE(QTest::qWaitForWindowExposed(&dialog));
+    dialog.activateWindow();
+    ASSERT_TRUE(QTest::qWaitForWindowActive(&dialog));
+    // A button that is pressed by its letter shows it for a moment.
     QTest::keyClick(&dialog, Qt::Key_S, Qt::AltModifier);
-    EXPECT_FALSE(dialog.setup().keepsGivenPages);
+    EXPECT_TRUE(QTest::qWaitFor([&] { return !dialog.setup().keepsGivenPages; }));
     QTest::keyClick(&dialog, Qt::Key_M, Qt::AltModifier);
-    EXPECT_TRUE(dialog.setup().keepsGivenPages);
+    EXPECT_TRUE(QTest::qWaitFor([&] { return dialog.setup().keepsGivenPages; }));
     field(dialog, "Bottom margin")->setFocus();
     QTest::keyClick(dialog.focusWidget(), Qt::Key_Tab);
     EXPECT_EQ(dialog.focusWidget(), choice(dialog, "As the report was &made (60 lines)")) << "below the margins";

@@ -33,13 +33,17 @@ std::vector<std::string> firstLines(const PdfReadBack &pdf, qsizetype length)
     return lines;
 }
 
-/// Pages of numbered lines under a heading "page N", as their writer laid them out.
-void writePages(UReportDoc &report, int pages, int lines, int linesOfPage)
+/// Pages of numbered lines under a heading "page N", as their writer lays them out: who ends the last line but one of a page
+/// begins the next page.
+void writePages(UReportDoc &report, int pages, int linesOfPage, int lines = 0)
 {
+    lines = lines > 0 ? lines : linesOfPage - 1;
     report.FixPage(linesOfPage, 80);
     report.SetHeaderFlag(false);
     for (int page = 1; page <= pages; ++page) {
-        report.NewPage(-1);
+        if (report.GetPageNumber() != page) {
+            report.NewPage(-1);
+        }
         report.WriteLine(QStringLiteral("page %1").arg(page), 0, 1, 0);
         for (int line = 2; line <= lines; ++line) {
             report.WriteLine(QStringLiteral("line %1 of page %2").arg(line).arg(page), 0, 1, 0);
@@ -82,7 +86,7 @@ TEST(UReportViewGivenPages, EachPageIsPrintedOnASheetOfItsOwn)
         AnsweredPrinting printing;
         printing.changePrinter = [&row](QPrinter &printer) { printer.setPageSize(QPageSize(row.sheet.paper)); };
         ShownReport report;
-        writePages(report.report, row.pages, row.linesOfPage, row.linesOfPage);
+        writePages(report.report, row.pages, row.linesOfPage);
         report.report.SetMargins(row.sheet.margins);
         SetReportPrinterSetToPortrait(row.sheet.portrait);
         report.open().OnReportPrint();
@@ -99,44 +103,33 @@ TEST(UReportViewGivenPages, EachPageIsPrintedOnASheetOfItsOwn)
         ASSERT_EQ(begins.size(), static_cast<std::size_t>(row.pages)) << row.reason;
         for (int page = 1; page <= row.pages; ++page) {
             EXPECT_EQ(begins.at(static_cast<std::size_t>(page) - 1), "page " + std::to_string(page)) << row.reason;
-            const QString last = QStringLiteral("line %1 of page %2").arg(row.linesOfPage).arg(page);
+            const QString last = QStringLiteral("line %1 of page %2").arg(row.linesOfPage - 1).arg(page);
             EXPECT_TRUE(pdf.pages().join(u'\f').contains(last)) << row.reason;
         }
         SetReportPrinterSetToPortrait(true);
     }
 }
 
-TEST(UReportViewGivenPages, PagesThatAreOfferedArePrinted)
+TEST(UReportViewGivenPages, TheSheetsAreThePagesThatAreOffered)
 {
     struct Row
     {
-        QPageSize::PageSizeId paper;
-        int pages;
+        QMargins margins;
+        int sheets;
         const char *reason;
     };
-    for (const Row &row : {Row{QPageSize::A4, 5, "a sheet a page"}, Row{QPageSize::A6, 10, "in two pieces each"}}) {
-        kareport::setDefaultPrinter({});
+    constexpr Row rows[] = {
+        {{1000, 1000, 1200, 2000}, 5, "a sheet a page"},
+        {{1000, 10000, 1200, 10000}, 10, "97 mm take 46 lines of 5 points: two pieces each"},
+    };
+    for (const Row &row : rows) {
         AnsweredPrinting printing;
         ShownReport report;
-        writePages(report.report, 5, 72, 72);
-        UReportView &view = report.open();
-        QPrinter printer(QPrinter::HighResolution);
-        printer.setOutputFormat(QPrinter::PdfFormat);
-        printer.setOutputFileName(printing.file());
-        printer.setResolution(600);
-        printer.setPageSize(QPageSize(row.paper));
-        printer.setFullPage(true);
-        report.report.SetPageSize();
-        PrintInfo info;
-        info.printer = &printer;
-        printing.changePrinter = [](QPrinter &) {};
-        ASSERT_TRUE(view.OnPreparePrinting(info)) << row.reason;
-        QPainter painter(&printer);
-        view.OnBeginPrinting(painter, info);
-        EXPECT_EQ(view.GetPageStarts().size(), 5U) << "the report's own sheet is A4; " << row.reason;
-        EXPECT_EQ(printing.maxPages.back(), 5) << row.reason;
-        view.OnEndPrinting(painter, info);
-        EXPECT_TRUE(view.GetPageStarts().empty()) << row.reason;
+        writePages(report.report, 5, 72);
+        report.report.SetMargins(row.margins);
+        report.open().OnReportPrint();
+        EXPECT_THAT(printing.maxPages, ElementsAre(row.sheets)) << row.reason;
+        EXPECT_EQ(printing.printedPages(), row.sheets) << row.reason;
     }
 }
 
@@ -144,7 +137,7 @@ TEST(UReportViewGivenPages, PagesArePrintedInAnyOrder)
 {
     AnsweredPrinting printing;
     ShownReport report;
-    writePages(report.report, 4, 30, 40);
+    writePages(report.report, 4, 40, 30);
     UReportView &view = report.open();
     QPrinter printer(QPrinter::HighResolution);
     printer.setOutputFormat(QPrinter::PdfFormat);
@@ -203,7 +196,7 @@ TEST(UReportViewGivenPages, RangesOrderAndCopiesAreTakenFromThePrinter)
         AnsweredPrinting printing;
         printing.changePrinter = row.set;
         ShownReport report;
-        writePages(report.report, 4, 30, 40);
+        writePages(report.report, 4, 40, 30);
         report.open().OnReportPrint();
         EXPECT_THAT(printing.maxPages, ElementsAre(4)) << row.reason;
         EXPECT_EQ(firstLines(readBack(printing.file()), 6), row.printed) << row.reason;
@@ -214,7 +207,7 @@ TEST(UReportViewGivenPages, ThePreviewShowsThePagesThatArePrinted)
 {
     AnsweredPrinting printing;
     ShownReport report;
-    writePages(report.report, 4, 72, 72);
+    writePages(report.report, 4, 72);
     SetReportPrinterSetToPortrait(false);
     report.open().OnReportPrintPreview();
     EXPECT_EQ(printing.previews, 1);
@@ -225,7 +218,7 @@ TEST(UReportViewGivenPages, PageSetupSwitchesToTheMeasuredPageAndBack)
 {
     AnsweredPrinting printing;
     ShownReport report;
-    writePages(report.report, 3, 60, 60);
+    writePages(report.report, 3, 60);
     UReportView &view = report.open();
     bool keeps = false;
     printing.changeSetup = [&keeps](kareport::PageSetup &setup) { setup.keepsGivenPages = keeps; };
@@ -237,8 +230,8 @@ TEST(UReportViewGivenPages, PageSetupSwitchesToTheMeasuredPageAndBack)
     EXPECT_EQ(report.report.GetLinesPerPage(), 80) << "what A4 takes";
     view.OnReportPrint();
     EXPECT_EQ(printing.maxPages.back(), 3) << "the end of each page is in the text: 180 lines of 80 are three sheets";
-    EXPECT_THAT(firstLines(readBack(printing.file()), 17),
-                ElementsAre("page 1\nline 2 of", "line 21 of page 2", "line 41 of page 3"))
+    EXPECT_THAT(firstLines(readBack(printing.file()), 16),
+                ElementsAre("page 1\nline 2 of", "line 21 of page ", "line 41 of page "))
         << "from sheet to sheet";
 
     keeps = true;
@@ -272,7 +265,7 @@ TEST(UReportViewGivenPages, AnEditKeepsThePagesOnTheirSheets)
 {
     AnsweredPrinting printing;
     ShownReport report;
-    writePages(report.report, 3, 60, 60);
+    writePages(report.report, 3, 60);
     UReportView &view = report.open();
     QTextCursor cursor(view.GetEdit().document());
     cursor.movePosition(QTextCursor::Down, QTextCursor::MoveAnchor, 10);
@@ -280,7 +273,8 @@ TEST(UReportViewGivenPages, AnEditKeepsThePagesOnTheirSheets)
     view.OnReportPrint();
     const PdfReadBack pdf = readBack(printing.file());
     EXPECT_THAT(firstLines(pdf, 6), ElementsAre("page 1", "page 2", "page 3"));
-    EXPECT_TRUE(pdf.pages().at(0).contains(QStringLiteral("line 60 of page 1"))) << "61 lines on the first sheet";
+    EXPECT_TRUE(pdf.pages().at(0).contains(QStringLiteral("line 59 of page 1")))
+        << "60 lines on the first sheet, and an end";
 }
 
 TEST(UReportViewGivenPages, WideLinesWideCharactersAndTabsStayOnTheirSheets)
@@ -302,7 +296,7 @@ TEST(UReportViewGivenPages, WideLinesWideCharactersAndTabsStayOnTheirSheets)
     for (const Row &row : rows) {
         AnsweredPrinting printing;
         ShownReport report;
-        writePages(report.report, 1, 30, 60);
+        writePages(report.report, 1, 60, 30);
         report.report.WriteLine(row.line, 0, 1, 0);
         report.report.NewPage(-1);
         report.report.WriteLine(QStringLiteral("page 2"), 0, 1, 0);
@@ -323,7 +317,7 @@ TEST(UReportViewGivenPages, RichTextHasThePagesOfTheReport)
     AnsweredPrinting printing;
     ShownReport report;
     report.report.SetRTFDataFlag(true);
-    writePages(report.report, 3, 60, 60);
+    writePages(report.report, 3, 60);
     UReportView &view = report.open();
     ASSERT_TRUE(view.ShowsFormats());
     view.OnReportPrint();

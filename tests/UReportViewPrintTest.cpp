@@ -19,9 +19,9 @@ using testing::IsEmpty;
 class PreparedView
 {
 public:
-    explicit PreparedView(int lines)
+    explicit PreparedView(int lines, const QMargins &margins = {1000, 1000, 1200, 2000})
     {
-        report.report.FixPage(72, 80);
+        report.report.SetMargins(margins);
         report.report.SetPageSize();
         writeLines(report.report, lines);
         view = &report.open();
@@ -43,18 +43,31 @@ public:
 
 TEST(UReportViewPrint, PreparingSetsPaperMarginsAndPages)
 {
+    constexpr QMargins usual(1000, 1000, 1200, 2000);
+    constexpr QMargins seventyTwo(1000, 1000, 1200, 4642); // lines of 78 dots
+    constexpr QMargins usualTwips(567, 567, 680, 1134);
+    constexpr QMargins lowerTwips(567, 567, 680, 2632);
     struct Row
     {
         int lines;
+        QMargins margins;
+        QMargins twips;
         int pages;
         const char *reason;
     };
-    for (const Row &row : {Row{0, 0, "nothing"}, Row{1, 1, "a line"}, Row{72, 1, "a page"}, Row{73, 2, "a line more"}})
-    {
-        const PreparedView prepared(row.lines);
+    const Row rows[] = {
+        {0, usual, usualTwips, 0, "nothing"},
+        {1, usual, usualTwips, 1, "a line"},
+        {80, usual, usualTwips, 1, "a page of 80 lines"},
+        {81, usual, usualTwips, 2, "a line more"},
+        {72, seventyTwo, lowerTwips, 1, "a page of 72 lines"},
+        {73, seventyTwo, lowerTwips, 2, "a line more than that"},
+    };
+    for (const Row &row : rows) {
+        const PreparedView prepared(row.lines, row.margins);
         EXPECT_EQ(prepared.info.maxPage, row.pages) << row.reason;
         EXPECT_THAT(prepared.printing.maxPages, ElementsAre(row.pages)) << "offered to the user; " << row.reason;
-        EXPECT_EQ(prepared.view->GetPrintMargins(), QMargins(567, 567, 680, 1134)) << row.reason;
+        EXPECT_EQ(prepared.view->GetPrintMargins(), row.twips) << row.reason;
         EXPECT_EQ(prepared.view->GetPaperSize(), QSize(11906, 16838)) << "A4; " << row.reason;
         EXPECT_EQ(prepared.info.printer, &prepared.printer) << "a printer that is there is kept; " << row.reason;
     }

@@ -2,6 +2,7 @@
 
 #include "AppMessageBox.h"
 #include "MarginPicture.h"
+#include "PageHeader.h"
 #include "Preferences.h"
 #include "PrintDialogs.h"
 #include "PrintGeometry.h"
@@ -328,10 +329,12 @@ std::vector<kareport::PrintSheet> UReportView::givenSheets(kareport::LinePager &
     }
     // The pages of what is shown: formats and line ends make the places of characters differ from those in the report.
     const QString shown = pager.text().toPlainText();
+    const std::vector<qint64> starts = report->HoldsRichTextSource()
+                                           ? kareport::pageHeadersIn(shown)
+                                           : kareport::startsOfLines(shown, report->GetPageStartLines());
     const int lines = report->GetLinesPerPage();
-    return kareport::printSheets(
-        pager, printableRect(),
-        kareport::reportPages(shown, kareport::startsOfLines(shown, report->GetPageStartLines()), lines), lines);
+    return kareport::printSheets(pager, printableRect(), kareport::reportPages(QStringView(shown), starts, lines),
+                                 lines);
 }
 
 bool UReportView::printsGivenPages() const
