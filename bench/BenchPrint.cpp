@@ -76,7 +76,7 @@ void countPrintPages(benchmark::State &state)
     Printed printed(state.range(0));
     qint64 pages = 0;
     for (auto _ : state) {
-        const kareport::LinePager pager(printed.document, printed.printer);
+        kareport::LinePager pager(printed.document, printed.printer);
         for (qint64 next = 0; next < pager.length(); ++pages) {
             next = pager.layOut(printed.page, next, -1);
         }
@@ -94,6 +94,7 @@ void printPages(benchmark::State &state)
     const long before = peakMemory();
     int pages = 0;
     for (auto _ : state) {
+        kareport::LinePager pager(printed.document, printed.printer);
         std::vector<qint64> starts = {0};
         kareport::PrintSource source;
         source.expectedPages = static_cast<int>(state.range(0));
@@ -102,7 +103,6 @@ void printPages(benchmark::State &state)
         source.isUnchanged = [] { return true; };
         source.find = [](QPainter &, int) { return true; };
         source.print = [&](QPainter &painter, int) {
-            const kareport::LinePager pager(printed.document, printed.printer);
             starts.push_back(pager.layOut(printed.page, starts.back(), -1, &painter));
             return starts.back() < pager.length();
         };
