@@ -1,6 +1,8 @@
 #include "Profile.h"
 
 #include <QApplication>
+#include <QDir>
+#include <QTemporaryDir>
 
 #include <gmock/gmock.h>
 
@@ -10,6 +12,9 @@ int main(int argc, char **argv)
     qputenv("QT_QPA_PLATFORM", "offscreen");
     const QApplication application(argc, argv);
     kareport::setProfileStore(kareport::makeMemoryProfile());
+    // A file that a test writes by its name alone is not left among the sources.
+    const QTemporaryDir folder;
+    QDir::setCurrent(folder.path());
     testing::InitGoogleMock(&argc, argv);
     return RUN_ALL_TESTS();
 }
