@@ -88,6 +88,8 @@ public:
     /// changes the length.
     quint64 GetEditCount() const { return editCount_; }
     QString CopyText() const;
+    /// A copy of a piece of the text: of as many characters of it as there are. @param at  the first character, from 0
+    QString CopyText(qint64 at, qint64 count) const;
     /// Empties the report. The next line written begins page 1.
     virtual void Clear();
     /// Makes room for so many characters of the kind written so far. @return 0 when there is no memory for them

@@ -1,5 +1,7 @@
 #include "UReportDoc.h"
 
+#include <algorithm>
+
 bool UReportDoc::ReplaceText(qint64 at, qint64 removed, QStringView inserted)
 {
     if (!page_.replace(at, removed, inserted)) {
@@ -10,6 +12,24 @@ bool UReportDoc::ReplaceText(qint64 at, qint64 removed, QStringView inserted)
         SetModifiedFlag(true);
     }
     return true;
+}
+
+namespace
+{
+
+template <typename View>
+QString piece(View text, qint64 at, qint64 count)
+{
+    const qint64 first = std::clamp<qint64>(at, 0, text.size());
+    return text.sliced(first, std::clamp<qint64>(count, 0, text.size() - first)).toString();
+}
+
+} // namespace
+
+QString UReportDoc::CopyText(qint64 at, qint64 count) const
+{
+    const kareport::ReportText &text = page_.text();
+    return text.isNarrow() ? piece(text.narrowView(), at, count) : piece(text.view(), at, count);
 }
 
 QString UReportDoc::CopyText() const

@@ -584,6 +584,11 @@
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
+        <source>Loading</source>
+        <translation>読み込み中</translation>
+    </message>
+    <message>
+        <location filename="../view/ReportViewWidget.cpp"/>
         <source>Zoom</source>
         <translation>ズーム</translation>
     </message>
@@ -592,6 +597,12 @@
         <source>%1 %</source>
         <comment>zoom in percent</comment>
         <translation>%1%</translation>
+    </message>
+    <message>
+        <location filename="../view/ReportViewWidget.cpp"/>
+        <source>Loading %1 %</source>
+        <comment>percent of a report</comment>
+        <translation>読み込み中 %1 %</translation>
     </message>
     <message>
         <location filename="../view/UReportViewPrint.cpp"/>

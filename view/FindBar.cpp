@@ -143,7 +143,7 @@ void FindBar::watchDocument()
 void FindBar::recount()
 {
     recountTimer_.stop();
-    if (isVisible()) {
+    if (isVisible() && !edit_.isLoading()) { // which counts as an edit when it ends
         counter_.start(*edit_.document(), search_);
     }
     showCount();
@@ -182,6 +182,7 @@ bool FindBar::select(const QTextBlock &block, qsizetype at)
 
 bool FindBar::findFrom(int position)
 {
+    edit_.finishLoading();
     const QTextBlock start = edit_.document()->findBlock(position);
     QTextBlock block = start;
     qsizetype from = position - start.position();
@@ -209,6 +210,7 @@ bool FindBar::findPrevious()
     if (search_.isEmpty()) {
         return false;
     }
+    edit_.finishLoading();
     const QTextBlock start = edit_.document()->findBlock(edit_.textCursor().selectionStart());
     QTextBlock block = start;
     qsizetype before = edit_.textCursor().selectionStart() - start.position();

@@ -12,6 +12,7 @@
 
 #include <algorithm>
 #include <iterator>
+#include <utility>
 
 namespace kareport
 {
@@ -62,6 +63,7 @@ ReportEdit::ReportEdit(QWidget *parent) : QPlainTextEdit(parent)
     setAccessibleName(Xlate("Report text"));
     setLineWrapMode(NoWrap);
     setWordWrapMode(QTextOption::WrapAtWordBoundaryOrAnywhere);
+    connect(verticalScrollBar(), &QScrollBar::actionTriggered, this, [this] { isScrolled_ = true; });
     watch();
 }
 
@@ -86,6 +88,73 @@ void ReportEdit::loadPlainText(const QString &text)
     take(loaded);
 }
 
+void ReportEdit::loadPlainTextInPieces(PiecedText text, std::function<void()> loaded)
+{
+    setPalette(QPalette());
+    const Place before = isWaiting() ? wanted_ : place();
+    QTextDocument *filled = newDocument(this, font());
+    filled->setUndoRedoEnabled(false);
+    auto loader = std::make_unique<PieceLoader>(*filled, std::move(text), [this](bool isWhole) {
+        if (isWhole) {
+            endLoading();
+        } else if (loading_) {
+            loading_();
+        }
+    });
+    loader->addPiece(); // before the control's cursor stands in the document, at whose end the pieces come in
+    take(filled);
+    document()->setUndoRedoEnabled(false);
+    loader_ = std::move(loader);
+    loaded_ = std::move(loaded);
+    wanted_ = before;
+    if (!loader_->isDone() && before.position >= length_) {
+        goTo({length_ - 1, before.top, before.left}); // a cursor at the end would go along with it
+    }
+    waiting_ = textCursor().position();
+    isScrolled_ = false;
+    setReadOnly(true);
+    if (loader_->isDone()) {
+        endLoading();
+    } else if (loading_) {
+        loading_();
+    }
+}
+
+void ReportEdit::finishLoading()
+{
+    if (isLoading()) {
+        loader_->finish();
+        endLoading();
+    }
+}
+
+void ReportEdit::stopLoading()
+{
+    if (isLoading()) {
+        loader_.reset();
+        loaded_ = {};
+        setReadOnly(false);
+    }
+}
+
+void ReportEdit::endLoading()
+{
+    const bool wasWaiting = isWaiting();
+    loader_.reset();
+    setReadOnly(false);
+    document()->setUndoRedoEnabled(true);
+    document()->setModified(false);
+    if (wasWaiting) {
+        goTo(wanted_);
+    }
+    if (loading_) {
+        loading_();
+    }
+    if (const auto loaded = std::exchange(loaded_, {})) {
+        loaded();
+    }
+}
+
 std::optional<RichTextError> ReportEdit::loadRichText(QStringView text)
 {
     return loadRichText([text](QTextDocument &loaded) { return readRichText(text, loaded); });
@@ -103,24 +172,37 @@ ReportEdit::loadRichText(const std::function<std::optional<RichTextError>(QTextD
 
 void ReportEdit::take(QTextDocument *loaded)
 {
-    const int position = textCursor().position();
-    const int top = verticalScrollBar()->value();
-    const int left = horizontalScrollBar()->value();
-    const QPointer<QTextDocument> before = document();
+    const Place before = isWaiting() ? wanted_ : place();
+    const QPointer<QTextDocument> replaced = document();
 
+    stopLoading();
     disconnect(watching_);
     loaded->clearUndoRedoStacks();
     loaded->setUndoRedoEnabled(true);
     setDocument(loaded);
-    delete before;
+    delete replaced;
     watch();
     applyZoom();
+    goTo(before);
+}
 
+ReportEdit::Place ReportEdit::place() const
+{
+    return {textCursor().position(), verticalScrollBar()->value(), horizontalScrollBar()->value()};
+}
+
+bool ReportEdit::isWaiting() const
+{
+    return isLoading() && !isScrolled_ && textCursor().position() == waiting_;
+}
+
+void ReportEdit::goTo(const Place &place)
+{
     QTextCursor cursor(document());
-    cursor.setPosition(std::min(position, length_));
+    cursor.setPosition(std::min(place.position, length_));
     setTextCursor(cursor);
-    verticalScrollBar()->setValue(top);
-    horizontalScrollBar()->setValue(left);
+    verticalScrollBar()->setValue(place.top);
+    horizontalScrollBar()->setValue(place.left);
 }
 
 void ReportEdit::watch()
@@ -141,7 +223,7 @@ void ReportEdit::noteEdit(int position, int removed, int added)
     change.lengthBefore = length_;
     change.lineEndsInAll = lineEnds_;
     noteLength();
-    if (isFollowing_ || !edited_) {
+    if (isFollowing_ || isLoading() || !edited_) {
         return;
     }
     // The end of the last paragraph, which is no character of the text, is counted with an edit that touches it.
@@ -170,7 +252,7 @@ void ReportEdit::noteEdit(int position, int removed, int added)
 
 bool ReportEdit::applyChange(const ReportChange &change)
 {
-    if (change.lengthBefore != length_ || change.lineEndsInAll != lineEnds_) {
+    if (isLoading() || change.lengthBefore != length_ || change.lineEndsInAll != lineEnds_) {
         return false;
     }
     isFollowing_ = true;
@@ -182,8 +264,15 @@ bool ReportEdit::applyChange(const ReportChange &change)
     return true;
 }
 
-QString ReportEdit::windowText() const
+void ReportEdit::selectAll()
 {
+    finishLoading();
+    QPlainTextEdit::selectAll();
+}
+
+QString ReportEdit::windowText()
+{
+    finishLoading();
     const QString raw = document()->toRawText();
     QString text;
     text.reserve(windowTextLength());
@@ -259,6 +348,11 @@ void ReportEdit::keyPressEvent(QKeyEvent *event)
     if (const auto zoom = zoomOfKey(*event)) {
         *zoom == 0 ? setZoomPercent(100) : zoomStep(*zoom);
         return;
+    }
+    if (event->matches(QKeySequence::MoveToEndOfDocument) || event->matches(QKeySequence::SelectEndOfDocument) ||
+        event->matches(QKeySequence::SelectAll))
+    {
+        finishLoading(); // the end is that of the whole text
     }
     if (event->matches(QKeySequence::InsertLineSeparator) && !isReadOnly()) {
         // A report has lines only: a break within a paragraph would be a character that no printer knows.

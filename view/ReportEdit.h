@@ -1,6 +1,7 @@
 #pragma once
 
 #include "KaReportExport.h"
+#include "PieceLoader.h"
 #include "ReportChange.h"
 #include "RichTextReader.h"
 
@@ -10,6 +11,7 @@
 #include <QTextBlock>
 
 #include <functional>
+#include <memory>
 #include <optional>
 
 namespace kareport
@@ -31,6 +33,18 @@ public:
     /// Replaces the content, without an edit and without undo steps. The place of the cursor and of the window are kept as
     /// far as there is text.
     void loadPlainText(const QString &text);
+    /// The same in pieces: its beginning at once, the rest from the event loop. Until all of it is there nothing can be
+    /// edited, and a place beyond what has been loaded is kept for the end.
+    /// @param loaded  called when all of it is there; not when another text is loaded first
+    void loadPlainTextInPieces(PiecedText text, std::function<void()> loaded);
+    bool isLoading() const { return loader_ != nullptr; }
+    /// How much of the text has been loaded.
+    int loadedPercent() const { return loader_ ? loader_->percent() : 100; }
+    /// Loads at once what is missing.
+    void finishLoading();
+    /// Leaves what is missing out.
+    void stopLoading();
+
     /// @return what is wrong with the rich text; what was read up to there is shown
     std::optional<RichTextError> loadRichText(QStringView text);
     /// The same with a reader, which fills the document that it is given.
@@ -43,12 +57,16 @@ public:
     void setFocusHandler(std::function<void()> handler) { focused_ = std::move(handler); }
     /// Called when the zoom has changed.
     void setZoomHandler(std::function<void()> handler) { zoomed_ = std::move(handler); }
+    /// Called when more of the text has been loaded.
+    void setLoadHandler(std::function<void()> handler) { loading_ = std::move(handler); }
     /// Makes an edit that was made elsewhere. The handler of edits is not called.
     /// @return false, changing nothing, when the control does not hold the text that the edit was made in
     bool applyChange(const ReportChange &change);
 
-    /// The whole text, its lines ended by CR LF.
-    QString windowText() const;
+    /// The whole text, its lines ended by CR LF. What is missing of it is loaded first.
+    QString windowText();
+    /// As the control's own, after all of the text has been loaded.
+    void selectAll();
     /// The line at the top of the window, from 0.
     int firstVisibleLine() const { return firstVisibleBlock().blockNumber(); }
     qint64 windowTextLength() const { return qint64(length_) + lineEnds_; }
@@ -68,7 +86,20 @@ protected:
     void insertFromMimeData(const QMimeData *source) override;
 
 private:
+    /// Where cursor and window stand.
+    struct Place
+    {
+        int position;
+        int top;
+        int left;
+    };
+
+    Place place() const;
+    /// Whether they wait for a place that has not been loaded yet.
+    bool isWaiting() const;
+    void goTo(const Place &place);
     void take(QTextDocument *loaded);
+    void endLoading();
     void watch();
     void noteEdit(int position, int removed, int added);
     void noteLength();
@@ -77,7 +108,13 @@ private:
     std::function<void(const ReportChange &)> edited_;
     std::function<void()> focused_;
     std::function<void()> zoomed_;
+    std::function<void()> loading_;
     QMetaObject::Connection watching_;
+    std::unique_ptr<PieceLoader> loader_;
+    std::function<void()> loaded_; ///< called when `loader_` has done
+    Place wanted_ = {};            ///< where the window stood before, which may not have been loaded yet
+    int waiting_ = 0;              ///< the cursor's position until then
+    bool isScrolled_ = false;      ///< by the user, since loading began
     bool isFollowing_ = false;
     int length_ = 0;
     int lineEnds_ = 0;

@@ -53,6 +53,7 @@ ReportViewWidget::ReportViewWidget(QWidget *parent)
       pageLabel_(newLabel(this, Xlate("Page"), Xlate("Page %1 of %2").arg(88888).arg(88888))),
       lineLabel_(newLabel(this, Xlate("Line"), Xlate("Line %1").arg(8888888))),
       columnLabel_(newLabel(this, Xlate("Column"), Xlate("Column %1").arg(8888))),
+      loadLabel_(newLabel(this, Xlate("Loading"), QString())),
       zoomLabel_(newLabel(this, Xlate("Zoom"), Xlate("%1 %@@zoom in percent").arg(888)))
 {
     auto *status = new QHBoxLayout;
@@ -62,6 +63,7 @@ ReportViewWidget::ReportViewWidget(QWidget *parent)
     status->addWidget(lineLabel_);
     status->addWidget(columnLabel_);
     status->addStretch();
+    status->addWidget(loadLabel_);
     status->addWidget(zoomLabel_);
 
     auto *column = new QVBoxLayout(this);
@@ -74,6 +76,7 @@ ReportViewWidget::ReportViewWidget(QWidget *parent)
 
     setFocusProxy(edit_);
     edit_->setZoomHandler([this] { showZoom(); });
+    edit_->setLoadHandler([this] { showLoading(); });
     // What a key writes is on the screen before the place below it.
     placeTimer_.setSingleShot(true);
     placeTimer_.setInterval(0);
@@ -113,6 +116,7 @@ int ReportViewWidget::currentPage() const
 
 void ReportViewWidget::goToPage(int page)
 {
+    edit_->finishLoading();
     const int line = (std::clamp(page, 1, pageCount()) - 1) * linesPerPage();
     const QTextBlock block = edit_->document()->findBlockByNumber(line);
     edit_->setTextCursor(QTextCursor(block));
@@ -125,6 +129,12 @@ void ReportViewWidget::showPlace()
     pageLabel_->setText(Xlate("Page %1 of %2").arg(currentPage()).arg(pageCount()));
     lineLabel_->setText(Xlate("Line %1").arg(cursor.blockNumber() + 1));
     columnLabel_->setText(Xlate("Column %1").arg(columnOf(cursor)));
+}
+
+void ReportViewWidget::showLoading()
+{
+    loadLabel_->setText(edit_->isLoading() ? Xlate("Loading %1 %@@percent of a report").arg(edit_->loadedPercent())
+                                           : QString());
 }
 
 void ReportViewWidget::showZoom()
@@ -141,6 +151,7 @@ void ReportViewWidget::openFindBar()
 void ReportViewWidget::openPageBar()
 {
     findBar_->hide();
+    edit_->finishLoading();
     pageBar_->open(currentPage(), pageCount());
 }
 

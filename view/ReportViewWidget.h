@@ -29,6 +29,8 @@ public:
     QLabel &pageLabel() const { return *pageLabel_; }
     QLabel &lineLabel() const { return *lineLabel_; }
     QLabel &columnLabel() const { return *columnLabel_; }
+    /// How much of a long report has been loaded; empty when all of it is there.
+    QLabel &loadLabel() const { return *loadLabel_; }
     QLabel &zoomLabel() const { return *zoomLabel_; }
 
     /// Where the lines of a page are asked for; 72 without.
@@ -60,6 +62,7 @@ private:
     Action actionOfKey(const QKeyEvent &event) const;
     void closeBar();
     int linesPerPage() const;
+    void showLoading();
     void showZoom();
 
     ReportEdit *edit_;
@@ -68,6 +71,7 @@ private:
     QLabel *pageLabel_;
     QLabel *lineLabel_;
     QLabel *columnLabel_;
+    QLabel *loadLabel_;
     QLabel *zoomLabel_;
     QTimer placeTimer_; ///< shows the place anew
     std::function<int()> linesPerPage_;

@@ -19,6 +19,15 @@ using kareport::ReportChange;
 using kareport::ReportEdit;
 using kareport::ReportViewWidget;
 
+namespace
+{
+
+/// Shorter texts are loaded before anybody notices.
+constexpr qint64 shortestPieced = 500'000;
+constexpr qint64 longestRichTextHead = 64;
+
+} // namespace
+
 UReportView::UReportView()
 {
     auto *widget = new ReportViewWidget;
@@ -42,6 +51,8 @@ UReportView::~UReportView()
         auto *widget = static_cast<ReportViewWidget *>(widget_.data());
         edit_->setFocusHandler({});
         edit_->setEditHandler({});
+        edit_->setLoadHandler({});
+        edit_->stopLoading();
         widget->setPressHandler({});
         widget->setLinesPerPage({});
         widget->hide();
@@ -92,7 +103,9 @@ void UReportView::OnUpdate(UView *sender, long hint, void *hintObject)
     }
     m_nWordWrap = WrapNone;
     WrapChanged();
-    UpdateData(true);
+    if (!loadInPieces()) {
+        UpdateData(true);
+    }
     UView::OnUpdate(sender, hint, hintObject);
 }
 
@@ -123,6 +136,32 @@ void UReportView::UpdateData(bool toView)
     if (!report->GetRTFDataFlag() && wrap == WrapNone) {
         noteMirrored();
     }
+}
+
+bool UReportView::loadInPieces()
+{
+    const UReportDoc *report = GetDocument();
+    if (!loadsInPieces_ || report == nullptr || report->GetRTFDataFlag() || report->GetTextLength() < shortestPieced ||
+        kareport::isRichText(report->CopyText(0, longestRichTextHead)))
+    {
+        return false;
+    }
+    isMirrored_ = false;
+    showsFormats_ = false;
+    // What a host appends meanwhile is shown with its next update. Any other change begins the load anew.
+    const quint64 edits = report->GetEditCount();
+    const auto read = [report, edits](qint64 at, qint64 count) {
+        const bool isSame = UReportDoc::IsReportAvailable(report) && report->GetEditCount() == edits;
+        return isSame ? report->CopyText(at, count) : QString();
+    };
+    edit_->loadPlainTextInPieces({report->GetTextLength(), read}, [this, edits] {
+        if (GetDocument() != nullptr && GetDocument()->GetEditCount() != edits) {
+            OnUpdate(nullptr, 0, nullptr);
+        } else {
+            noteMirrored();
+        }
+    });
+    return true;
 }
 
 void UReportView::noteMirrored()
@@ -261,6 +300,9 @@ void UReportView::OnSaveReportText()
 
 bool UReportView::streamRichText(QIODevice &device) const
 {
+    if (widget_) {
+        edit_->finishLoading();
+    }
     return widget_ && kareport::writeRichText(device, *edit_->document());
 }
 
@@ -269,6 +311,7 @@ bool UReportView::streamPlainText(QIODevice &device) const
     if (!widget_) {
         return false;
     }
+    edit_->finishLoading();
     // Line by line, so that a long report is not copied as a whole.
     constexpr qsizetype pieceSize = 64 * 1024;
     QString piece;

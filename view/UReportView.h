@@ -63,6 +63,10 @@ public:
     /// Whether the text was rich text when it was loaded: its formats may then stand in the control alone.
     bool ShowsFormats() const { return showsFormats_; }
 
+    /// Whether a long text is loaded in pieces when the view is updated, so that the window answers meanwhile. It is not
+    /// unless a host says so: a view that has been updated then shows the whole text.
+    void SetLoadsInPieces(bool on) { loadsInPieces_ = on; }
+
     /// Gives the control its font. @return 0, or -1 when it cannot be made
     int OnCreate();
     void OnInitialUpdate() override;
@@ -114,6 +118,7 @@ public:
 
 private:
     void WrapChanged();
+    bool loadInPieces();
     void noteMirrored();
     QRect printableRect() const; ///< twips
     std::unique_ptr<kareport::PrintRun> makeRun(QPaintDevice &device) const;
@@ -131,6 +136,7 @@ private:
     kareport::ReportEdit *edit_ = nullptr; ///< owned by the widget
     std::vector<kareport::Command> commands_;
     WordWrap m_nWordWrap = WrapNone;
+    bool loadsInPieces_ = false;
     bool isMirrored_ = false;   ///< whether the document holds the control's text, its lines ended by CR LF
     quint64 mirroredEdits_ = 0; ///< the document's edits by then
     bool showsFormats_ = false; ///< whether the control's text was rich text

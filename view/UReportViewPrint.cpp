@@ -195,6 +195,7 @@ bool UReportView::OnPreparePrinting(PrintInfo &info)
     if (report == nullptr) {
         return false;
     }
+    GetEdit().finishLoading();
     m_sizePaper = kareport::twipsOfDots(report->GetPageSize(), report->GetPrintResolution());
     info.maxPage = kareport::pageCount(report->GetLineCount(), report->GetLinesPerPage());
     m_rectMargin = kareport::twipsOfHundredths(report->GetMargins());

@@ -1,8 +1,10 @@
 #include "DeskApplication.h"
 
+#include "CReportViewPane.h"
 #include "DeskFrame.h"
 #include "Profile.h"
-#include "ReportInitialTemplate.h"
+#include "ReportEntry.h"
+#include "UReportView.h"
 
 #include <QFileInfo>
 
@@ -18,7 +20,12 @@ QString recentEntry(qsizetype number)
 
 DeskApplication::DeskApplication()
 {
-    AddDocTemplate(ReportInitialTemplate());
+    AddDocTemplate(kareport::makeReportTemplate([] { return new CReportViewPane; },
+                                                [] {
+                                                    auto view = std::make_unique<UReportView>();
+                                                    view->SetLoadsInPieces(true);
+                                                    return view;
+                                                }));
     QStringList files;
     for (qsizetype number = 1; !GetProfileString(QString(), recentEntry(number)).isEmpty(); ++number) {
         files.prepend(GetProfileString(QString(), recentEntry(number)));

@@ -1,0 +1,196 @@
+#include "ViewFixture.h"
+
+#include "FindBar.h"
+
+#include <QClipboard>
+#include <QLabel>
+#include <QLineEdit>
+#include <QScrollBar>
+
+namespace
+{
+
+QString longText()
+{
+    QString text;
+    for (int line = 0; line < 60'000; ++line) {
+        text += QStringLiteral("line %1 of a long report\r\n").arg(line);
+    }
+    return text;
+}
+
+/// A long report, and a view that loads it in pieces.
+class LongReport
+{
+public:
+    LongReport() : shown(longText())
+    {
+        auto *pane = new CViewPane;
+        view = showIn<UReportView>(*pane, shown.report);
+        view->SetLoadsInPieces(true);
+        view->OnInitialUpdate();
+        view->GetWidget()->resize(640, 400);
+        view->GetWidget()->show();
+        pane_ = pane;
+    }
+    ~LongReport() { pane_->ClosePane(); }
+    LongReport(const LongReport &) = delete;
+    LongReport &operator=(const LongReport &) = delete;
+
+    kareport::ReportEdit &edit() const { return view->GetEdit(); }
+    bool isWhole() const { return !edit().isLoading() && edit().document()->blockCount() == 60'001; }
+
+    ShownReport shown;
+    UReportView *view;
+
+private:
+    CViewPane *pane_;
+};
+
+TEST(UReportViewLoad, ShowsTheBeginningAtOnceAndTheRestFromTheEventLoop)
+{
+    LongReport report;
+    EXPECT_TRUE(report.edit().isLoading());
+    EXPECT_GT(report.edit().document()->blockCount(), 100) << "more than a window shows";
+    EXPECT_LT(report.edit().document()->blockCount(), 60'000);
+    EXPECT_TRUE(widgetOf(*report.view).loadLabel().text().contains(u'%'));
+    ASSERT_TRUE(waitUntil([&] { return !report.edit().isLoading(); }));
+    EXPECT_EQ(report.edit().windowText(), longText());
+    EXPECT_FALSE(report.shown.report.IsModified());
+    EXPECT_EQ(widgetOf(*report.view).loadLabel().text(), QString());
+}
+
+TEST(UReportViewLoad, TakesNoEditUntilAllOfItIsThere)
+{
+    LongReport report;
+    QTest::keyClicks(&report.edit(), QStringLiteral("x"));
+    QApplication::clipboard()->setText(QStringLiteral("pasted"));
+    report.edit().paste();
+    report.edit().cut();
+    report.edit().undo();
+    EXPECT_EQ(report.shown.lines().size(), longText().size() - 60'000);
+    EXPECT_FALSE(report.shown.report.IsModified());
+    ASSERT_TRUE(waitUntil([&] { return !report.edit().isLoading(); }));
+    EXPECT_FALSE(report.edit().document()->isUndoAvailable()) << "loading is no edit";
+    QTest::keyClicks(&report.edit(), QStringLiteral("x"));
+    EXPECT_TRUE(report.shown.report.IsModified());
+    EXPECT_TRUE(report.shown.lines().startsWith(QStringLiteral("xline 0")));
+    report.edit().undo();
+    EXPECT_TRUE(report.shown.lines().startsWith(QStringLiteral("line 0")));
+}
+
+TEST(UReportViewLoad, IsFinishedByWhatNeedsTheWholeText)
+{
+    struct Row
+    {
+        void (*act)(LongReport &report);
+        const char *reason;
+    };
+    const Row rows[] = {
+        {[](LongReport &report) { report.view->UpdateData(true); }, "loading from the document"},
+        {[](LongReport &report) { report.view->UpdateData(false); }, "loading into the document"},
+        {[](LongReport &report) { report.view->OnChange(); }, "taking over the text"},
+        {[](LongReport &report) {
+             QBuffer device;
+             device.open(QIODevice::WriteOnly);
+             report.view->streamRichText(device);
+         },
+         "saving as rich text"},
+        {[](LongReport &report) {
+             QBuffer device;
+             device.open(QIODevice::WriteOnly);
+             report.view->streamPlainText(device);
+         },
+         "handing the edited text back"},
+        {[](LongReport &report) {
+             kareport::PrintInfo info;
+             info.preview = true;
+             report.view->OnPreparePrinting(info);
+         },
+         "printing"},
+        {[](LongReport &report) {
+             widgetOf(*report.view).openFindBar();
+             QTest::keyClicks(&widgetOf(*report.view).findBar().field(), QStringLiteral("59999"));
+         },
+         "finding a text"},
+        {[](LongReport &report) { widgetOf(*report.view).openPageBar(); }, "asking for a page"},
+        {[](LongReport &report) { widgetOf(*report.view).goToPage(800); }, "going to a page"},
+        {[](LongReport &report) { report.edit().selectAll(); }, "selecting all"},
+        {[](LongReport &report) { QTest::keyClick(&report.edit(), Qt::Key_End, Qt::ControlModifier); },
+         "going to the end"},
+    };
+    for (const Row &row : rows) {
+        LongReport report;
+        ASSERT_TRUE(report.edit().isLoading()) << row.reason;
+        row.act(report);
+        EXPECT_TRUE(report.isWhole()) << row.reason;
+        EXPECT_EQ(report.shown.report.GetTextLength(), longText().size()) << row.reason;
+    }
+}
+
+TEST(UReportViewLoad, BeginsAnewWhenTheTextIsAnother)
+{
+    LongReport report;
+    report.shown.report.ReplaceText(0, 4, u"LINE");
+    report.shown.report.UpdateAllViews(nullptr);
+    ASSERT_TRUE(waitUntil([&] { return !report.edit().isLoading(); }));
+    EXPECT_TRUE(report.edit().windowText().startsWith(QStringLiteral("LINE 0")));
+    EXPECT_EQ(report.edit().windowText(), report.shown.report.CopyText());
+}
+
+TEST(UReportViewLoad, FollowsWhatIsTypedInAnotherViewMeanwhile)
+{
+    LongReport report;
+    UReportView &other = report.shown.open(); // which loads all at once
+    ASSERT_TRUE(report.edit().isLoading());
+    QTest::keyClicks(&other.GetEdit(), QStringLiteral("xy"));
+    ASSERT_TRUE(waitUntil([&] { return !report.edit().isLoading(); }));
+    EXPECT_TRUE(report.edit().windowText().startsWith(QStringLiteral("xyline 0")));
+    EXPECT_EQ(report.edit().windowText(), report.shown.report.CopyText());
+    QTest::keyClick(&report.edit(), Qt::Key_Delete);
+    EXPECT_TRUE(other.GetEdit().windowText() == report.shown.report.CopyText());
+}
+
+TEST(UReportViewLoad, ChangedBehindItsBackShowsTheChange)
+{
+    LongReport report;
+    report.shown.report.ReplaceText(longText().size(), 0, u"last words"); // by a host that tells nobody
+    ASSERT_TRUE(waitUntil([&] { return !report.edit().isLoading(); }));
+    EXPECT_TRUE(report.edit().windowText().endsWith(QStringLiteral("last words")));
+}
+
+TEST(UReportViewLoad, KeepsThePlaceWhereTheWindowStood)
+{
+    LongReport report;
+    report.edit().finishLoading();
+    putCursor(report.edit(), 700'000);
+    report.edit().verticalScrollBar()->setValue(30'000);
+    report.shown.report.UpdateAllViews(nullptr); // twice, as some commands do
+    report.shown.report.UpdateAllViews(nullptr);
+    ASSERT_TRUE(waitUntil([&] { return !report.edit().isLoading(); }));
+    EXPECT_EQ(report.edit().textCursor().position(), 700'000);
+    EXPECT_EQ(report.edit().verticalScrollBar()->value(), 30'000);
+}
+
+TEST(UReportViewLoad, GoesWithAViewThatIsClosedMeanwhile)
+{
+    {
+        LongReport report;
+        ASSERT_TRUE(report.edit().isLoading());
+    }
+    QCoreApplication::processEvents();
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+}
+
+TEST(UReportViewLoad, ShortTextsAndHostsThatDoNotAskForItLoadAtOnce)
+{
+    ShownReport shortText(QStringLiteral("one line\r\n"));
+    UReportView &view = shortText.open();
+    view.SetLoadsInPieces(true);
+    view.OnUpdate(nullptr, 0, nullptr);
+    EXPECT_FALSE(view.GetEdit().isLoading());
+    ShownReport longer(longText());
+    EXPECT_FALSE(longer.open().GetEdit().isLoading());
+}
+
+} // namespace

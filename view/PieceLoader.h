@@ -1,0 +1,49 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QString>
+#include <QTextDocument>
+#include <QTimer>
+
+#include <functional>
+
+namespace kareport
+{
+
+/// A long text that is read in pieces.
+struct PiecedText
+{
+    qint64 length = 0; ///< characters
+    /// Gives characters of the text, from 0. @return fewer than `count` only when the text has changed meanwhile
+    std::function<QString(qint64 at, qint64 count)> read;
+};
+
+/// Fills a text document piece by piece, so that the window answers while a long report is loaded. What has been loaded
+/// ends with a line end until all of it is there.
+class KAREPORT_EXPORT PieceLoader
+{
+public:
+    /// @param document  empty, without undo steps; must live as long as the loader
+    /// @param added     called after each piece that was added from the event loop, with whether it was the last
+    PieceLoader(QTextDocument &document, PiecedText text, std::function<void(bool isWhole)> added);
+
+    bool isDone() const { return at_ >= text_.length; }
+    int percent() const;
+    /// Adds the next piece.
+    void addPiece();
+    /// Adds all that is missing, without calling `added`.
+    void finish();
+
+private:
+    QString nextPiece();
+
+    QTextDocument &document_;
+    PiecedText text_;
+    std::function<void(bool)> added_;
+    qint64 at_ = 0;
+    qint64 pieceLength_;
+    QTimer timer_;
+};
+
+} // namespace kareport
