@@ -1,5 +1,10 @@
 #include "ReplaceFile.h"
 
+#include "LinkTarget.h"
+#include "UnfinishedFile.h"
+#include "WriteFailure.h"
+#include "Xlate.h"
+
 #include <QFile>
 #include <QFileInfo>
 #include <QSaveFile>
@@ -10,28 +15,49 @@ namespace kareport
 namespace
 {
 
-bool finish(const QFileDevice &file, bool done, QString *error)
+bool finish(bool done, QString *error, const QString &reason)
 {
     if (!done && error != nullptr) {
-        *error = file.errorString();
+        *error = reason;
     }
     return done;
+}
+
+/// Why a file was not written. Where the disk takes a part of a piece, that is no error to the file yet.
+QString reasonOf(const QFileDevice &file)
+{
+    const bool isSaid = file.error() != QFileDevice::NoError && file.errorString() != QFile().errorString();
+    return isSaid ? file.errorString() : QString();
 }
 
 } // namespace
 
 bool replaceFile(const QString &path, const std::function<bool(QIODevice &)> &write, QString *error)
 {
+    const QString target = linkTarget(path, error);
+    if (target.isEmpty() && !path.isEmpty()) {
+        return false;
+    }
     const QFileInfo info(path);
     if (info.exists() && !info.isFile() && !info.isDir()) {
         // A pipe or a device is written to: putting a file into its place would destroy it.
         QFile file(path);
-        return finish(file, file.open(QIODevice::WriteOnly) && write(file) && file.flush(), error);
+        const bool done = file.open(QIODevice::WriteOnly) && write(file) && file.flush();
+        return finish(done, error, file.errorString());
     }
     // A link stays a link: what it points to is replaced.
-    QSaveFile file(info.isSymLink() && info.exists() ? info.canonicalFilePath() : path);
+    QSaveFile file(target);
+    if (!file.open(QIODevice::WriteOnly)) {
+        return finish(false, error, file.errorString());
+    }
+    const UnfinishedFile unfinished(file.handle());
     // Without the flush a commit overlooks that the last bytes did not fit.
-    return finish(file, file.open(QIODevice::WriteOnly) && write(file) && file.flush() && file.commit(), error);
+    if (!write(file) || !file.flush()) {
+        QString reason = reasonOf(file);
+        reason = reason.isEmpty() ? whyWritingFails(file.handle()) : reason;
+        return finish(false, error, reason.isEmpty() ? Xlate("not all of it could be written") : reason);
+    }
+    return finish(file.commit(), error, file.errorString());
 }
 
 } // namespace kareport

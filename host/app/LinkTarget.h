@@ -1,0 +1,23 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QString>
+
+namespace kareport
+{
+
+/// Whether a link may be followed: not one of a stranger, which anybody can put into a folder that all write to, such as the
+/// system's folder for temporary files, under a name that somebody else is going to write. The rule is that of Linux's
+/// protected_symlinks, which many systems have switched off.
+/// @param folderMode  permissions and kind of the folder that the link stands in
+/// @param user        who follows it
+KAREPORT_EXPORT bool mayFollowLink(unsigned folderMode, unsigned folderOwner, unsigned linkOwner, unsigned user);
+
+/// The file that a name stands for, with every link on the way followed. The file itself need not exist. A name that leads
+/// nowhere is its own target: what is wrong with it shows when it is opened.
+/// @param error  receives a sentence when a link on the way may not be followed; may be null
+/// @return empty when a link may not be followed
+KAREPORT_EXPORT QString linkTarget(const QString &path, QString *error = nullptr);
+
+} // namespace kareport
