@@ -13,7 +13,8 @@
 /// What the program did.
 struct ProgramRun
 {
-    int status = -1; ///< the exit status; -1 when the program crashed or did not end
+    int status = -1; ///< the exit status; -1 when a signal ended the program, or it did not end
+    int signal = 0;  ///< that ended it
     QByteArray out;
     QByteArray err;
 
@@ -25,7 +26,9 @@ inline ProgramRun endOf(QProcess &process)
 {
     ProgramRun run;
     const bool ended = process.waitForFinished(60'000);
-    run.status = ended && process.exitStatus() == QProcess::NormalExit ? process.exitCode() : -1;
+    const bool isWhole = ended && process.exitStatus() == QProcess::NormalExit;
+    run.status = isWhole ? process.exitCode() : -1;
+    run.signal = ended && !isWhole ? process.exitCode() : 0;
     run.out = process.readAllStandardOutput();
     run.err = process.readAllStandardError();
     return run;

@@ -46,4 +46,29 @@ TEST(CommandLineMemory, AReportThatDoesNotFitIsNotWrittenInPart)
     EXPECT_TRUE(wasRefused);
 }
 
+TEST(CommandLineMemory, WhereverItEndsTheProgramSaysSo)
+{
+#if defined(__SANITIZE_ADDRESS__)
+    GTEST_SKIP() << "the address sanitizer needs more address space than any limit leaves";
+#endif
+    const CommandLineFolder folder;
+    // Rows that several batches take, on a thread of their own.
+    folder.put("points.csv", "Number,Northing\n" + QByteArray("1,2.5\n").repeated(50'000));
+    int refused = 0;
+    for (rlim_t megabytes = 60; megabytes < 140; megabytes += 2) {
+        folder.put("out.rep", "kept");
+        const ProgramRun run = runWithin(folder.path(), words("render job.json -o out.rep"), megabytes);
+        if (runWithin(folder.path(), words("--version"), megabytes).status != 0) {
+            continue; // the program's libraries have no room
+        }
+        EXPECT_TRUE(run.status == 0 || run.status == 2) << megabytes << run.all().constData();
+        if (run.status == 2) {
+            ++refused;
+            EXPECT_TRUE(run.err.contains("there is not enough memory for ")) << run.err.constData();
+        }
+        EXPECT_EQ(folder.bytesOf("out.rep") == "kept", run.status != 0) << megabytes;
+    }
+    EXPECT_GT(refused, 0);
+}
+
 } // namespace

@@ -28,10 +28,11 @@ std::optional<QString> exactText(const QString &path)
     if (errorOf(file) != nullptr || path.endsWith(u".rtf", Qt::CaseInsensitive)) {
         return std::nullopt;
     }
-    const std::string_view view = std::get<std::shared_ptr<const FileBytes>>(file)->view();
+    const auto &saved = *std::get<std::shared_ptr<const FileBytes>>(file);
+    const std::string_view view = saved.view();
     QString text;
     const QByteArrayView bytes(view.data(), static_cast<qsizetype>(view.size()));
-    if (decodeReportText(bytes, text) || isRichText(text)) {
+    if (decodeReportText(bytes, text) || isRichText(text) || saved.lostBytes()) {
         return std::nullopt;
     }
     return text;

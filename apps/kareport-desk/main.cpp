@@ -3,6 +3,7 @@
 #include "DeskFrame.h"
 #include "DeskPreferences.h"
 #include "Language.h"
+#include "ProcessSetup.h"
 #include "Xlate.h"
 
 #include <QApplication>
@@ -11,6 +12,7 @@
 
 int main(int argc, char **argv)
 {
+    kareport::prepareProcess();
     QApplication application(argc, argv);
     QApplication::setApplicationName(QStringLiteral("KaReport"));
     QApplication::setApplicationVersion(QStringLiteral(KAREPORT_VERSION));

@@ -1,24 +1,10 @@
 #include "Commands.h"
 
-#include "Progress.h"
 #include "TemplateCheck.h"
 #include "TemplateSource.h"
 
-#include <cstdio>
-
 namespace kareport
 {
-
-void printLine(const QString &line)
-{
-    std::fprintf(stdout, "%s\n", line.toUtf8().constData());
-}
-
-void printError(const QString &line)
-{
-    eraseProgress();
-    std::fprintf(stderr, "%s\n", line.toUtf8().constData());
-}
 
 ExitStatus CheckCommand::run() const
 {

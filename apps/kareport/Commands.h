@@ -17,7 +17,7 @@ enum ExitStatus
     exitUsage = 1,        ///< the command line is wrong
     exitInput = 2,        ///< the job, a template or data is wrong; nothing was written
     exitOutput = 3,       ///< an output could not be written; an existing file keeps its content
-    exitInterrupted = 130 ///< stopped from the keyboard; nothing was written
+    exitInterrupted = 130 ///< stopped by a signal, which then ends the program; nothing is half written
 };
 
 /// `kareport render`
@@ -31,6 +31,7 @@ struct RenderCommand
     QStringList outputs;
     QString as;
     QStringList sets;
+    std::optional<QString> limit; ///< "10M" for the size that no output may exceed
     bool progress = false;
     bool quiet = false;
 
@@ -89,7 +90,7 @@ struct ViewCommand
     ExitStatus run(int &argc, char **argv) const;
 };
 
-/// Writes a line to standard output or standard error.
+/// Writes a line to standard output or standard error. Characters that would command a terminal are made visible.
 void printLine(const QString &line);
 void printError(const QString &line);
 

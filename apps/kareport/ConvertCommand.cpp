@@ -2,9 +2,11 @@
 
 #include "CommandSetup.h"
 #include "FileBytes.h"
+#include "FileIdentity.h"
 #include "JobReader.h"
 #include "JobRunner.h"
 #include "LineEndings.h"
+#include "OutputClash.h"
 #include "OutputsWriter.h"
 #include "ReportTextDecoder.h"
 #include "RichTextReader.h"
@@ -94,6 +96,14 @@ ExitStatus ConvertCommand::run(int &argc, char **argv) const
     }
     job.outputs = {{output, *outputKindOf(output, outputKindFromName(as))}};
 
+    const QString identity = outputIdentity(job.outputs.front());
+    if (!identity.isEmpty() && identity == fileIdentity(input)) {
+        printError(
+            InputError{input, std::nullopt,
+                       Xlate("the output \"%1\" is the report that is read: another one was expected").arg(output)}
+                .message());
+        return exitInput;
+    }
     auto file = FileBytes::open(input);
     if (const InputError *error = errorOf(file)) {
         printError(error->message());
@@ -105,6 +115,9 @@ ExitStatus ConvertCommand::run(int &argc, char **argv) const
     const bool isRich = !richText.isEmpty();
     SavedReport saved;
     std::optional<InputError> error = isRich ? readRichText(input, richText, saved) : readText(input, bytes, saved);
+    if (const auto lost = std::get<std::shared_ptr<const FileBytes>>(file)->lostBytes()) {
+        error = lost;
+    }
     if (error) {
         printError(error->message());
         return exitInput;

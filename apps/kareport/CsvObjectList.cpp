@@ -62,8 +62,9 @@ CsvObjectList::CsvObjectList(std::shared_ptr<const FileBytes> file, char delimit
 void CsvObjectList::readHeader(const FindVariable &findVariable)
 {
     if (!reader_.next()) {
-        error_ = reader_.error() ? *reader_.error()
-                                 : reader_.errorAt(TextPlace(), Xlate("a header row of variable names was expected"));
+        error_ = endOfRows(reader_.error()
+                               ? *reader_.error()
+                               : reader_.errorAt(TextPlace(), Xlate("a header row of variable names was expected")));
         return;
     }
     QHash<QString, std::size_t> names;
@@ -138,11 +139,18 @@ void CsvObjectList::rewind()
     batchStart_ = 0;
 }
 
+/// Why the rows end where they do. What was cut off the file while it was read shows as rows that are wrong.
+std::optional<InputError> CsvObjectList::endOfRows(const std::optional<InputError> &error) const
+{
+    const auto lost = file_->lostBytes();
+    return lost ? lost : error;
+}
+
 /// Goes on to the next batch. @return false when there is none
 bool CsvObjectList::takeBatch()
 {
     if (batch_->isLast) {
-        error_ = batch_->error;
+        error_ = endOfRows(batch_->error);
         return false;
     }
     batchStart_ += batch_->count;
@@ -243,12 +251,12 @@ void CsvObjectList::Sort(const std::vector<unsigned> &ids)
         }
         Key &key = keys.emplace_back();
         key.place = {reader_.rowStart(), reader_.rowLine()};
-        error_ = storeCells(key.values, &ids);
-        if (error_) {
+        if (const auto wrong = storeCells(key.values, &ids)) {
+            error_ = endOfRows(wrong);
             return;
         }
     }
-    error_ = reader_.error();
+    error_ = endOfRows(reader_.error());
     std::vector<std::size_t> order(keys.size());
     std::iota(order.begin(), order.end(), std::size_t(0));
     std::stable_sort(order.begin(), order.end(), [&](std::size_t left, std::size_t right) {

@@ -54,6 +54,7 @@ private:
     bool seekNext();
     bool readRow(RowBatch &batch);
     bool takeBatch();
+    std::optional<InputError> endOfRows(const std::optional<InputError> &error) const;
     std::optional<InputError> storeCells(UDataObject &object, const std::vector<unsigned> *onlyIds) const;
 
     std::shared_ptr<const FileBytes> file_;

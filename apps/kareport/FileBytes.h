@@ -1,12 +1,14 @@
 #pragma once
 
 #include "InputError.h"
+#include "MappedFile.h"
 
 #include <QByteArray>
 #include <QFile>
 #include <QString>
 
 #include <memory>
+#include <optional>
 #include <string_view>
 
 namespace kareport
@@ -16,14 +18,21 @@ namespace kareport
 class FileBytes
 {
 public:
+    /// Opening and reading a pipe, which may wait, ends when the program is interrupted.
     static Expected<std::shared_ptr<const FileBytes>> open(const QString &path);
 
     std::string_view view() const { return view_; }
     const QString &path() const { return path_; }
+    /// What went wrong since the file was opened: bytes that were cut off meanwhile read as zeros. It must be asked when all
+    /// was read, and when what was read is wrong.
+    std::optional<InputError> lostBytes() const;
 
 private:
+    std::optional<QString> read(qint64 size);
+
     QString path_;
     QFile file_;
+    MappedFile mapped_;
     QByteArray content_; ///< of a file that is not mapped
     std::string_view view_;
 };

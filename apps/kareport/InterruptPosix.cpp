@@ -1,12 +1,14 @@
 #include "Interrupt.h"
 
+#include "Progress.h"
+#include "UnfinishedFile.h"
+
+#include <atomic>
 #include <csignal>
-
-#ifdef __unix__
+#include <ctime>
+#include <initializer_list>
+#include <string_view>
 #include <unistd.h>
-
-#include <cstring>
-#endif
 
 namespace kareport
 {
@@ -14,59 +16,113 @@ namespace kareport
 namespace
 {
 
-volatile std::sig_atomic_t interrupted = 0;
+constexpr long patience = 200'000'000; ///< nanoseconds that work has for coming to a safe point
 
-extern "C" void noteInterrupt(int /*signal*/)
+std::atomic<bool> interrupted{false};
+std::atomic<int> interruptingSignal{0};
+std::atomic<bool> hasTimer{false};
+timer_t timer;
+
+// What a handler uses must be free of locks.
+static_assert(std::atomic<bool>::is_always_lock_free && std::atomic<int>::is_always_lock_free);
+
+void endBy(int signal)
 {
-    interrupted = 1;
+    std::signal(signal, SIG_DFL);
+    sigset_t signals;
+    sigemptyset(&signals);
+    sigaddset(&signals, signal);
+    pthread_sigmask(SIG_UNBLOCK, &signals, nullptr);
+    raise(signal);
 }
 
-#ifdef __unix__
-
-/// A mapped file that somebody cuts short cannot be read any more.
-extern "C" void endForLostFile(int /*signal*/)
+void say(std::string_view text)
 {
-    constexpr char message[] =
-        "kareport: error: a data file was cut short while it was read; its report was not written\n";
-    constexpr int exitInput = 2;
-    const auto written = write(STDERR_FILENO, message, sizeof message - 1);
-    _exit(written < 0 ? exitInput + 1 : exitInput);
+    [[maybe_unused]] const ssize_t written = write(STDERR_FILENO, text.data(), text.size());
 }
 
-/// The first signal is noted and lets blocked calls end; the second one of its kind ends the program at once.
-void handleOnce(int signal, void (*handler)(int))
+void endAtOnce(int signal)
 {
-    struct sigaction action;
-    std::memset(&action, 0, sizeof action);
+    UnfinishedFile::remove();
+    say(isProgressShown() ? "\nkareport: stopped; no output is half written\n"
+                          : "kareport: stopped; no output is half written\n");
+    endBy(signal);
+}
+
+extern "C" void noteInterrupt(int signal)
+{
+    int none = 0;
+    if (!interruptingSignal.compare_exchange_strong(none, signal) || !hasTimer) {
+        endAtOnce(signal);
+    }
+    interrupted = true;
+    const itimerspec once = {{0, 0}, {0, patience}};
+    timer_settime(timer, 0, &once, nullptr);
+}
+
+extern "C" void endImpatiently(int /*signal*/)
+{
+    endAtOnce(interruptingSignal);
+}
+
+extern "C" void endForClosedReader(int signal)
+{
+    UnfinishedFile::remove();
+    endBy(signal);
+}
+
+/// Without restarting, so that a blocked call ends.
+void handle(int signal, void (*handler)(int))
+{
+    struct sigaction action = {};
+    sigaction(signal, nullptr, &action);
+    if (action.sa_handler == SIG_IGN) {
+        return;
+    }
+    action = {};
     action.sa_handler = handler;
-    action.sa_flags = static_cast<int>(SA_RESETHAND);
     sigaction(signal, &action, nullptr);
 }
-
-#endif
 
 } // namespace
 
 void catchInterrupts()
 {
-#ifdef __unix__
-    handleOnce(SIGINT, noteInterrupt);
-    handleOnce(SIGTERM, noteInterrupt);
-    handleOnce(SIGBUS, endForLostFile);
-#else
-    std::signal(SIGINT, noteInterrupt);
-    std::signal(SIGTERM, noteInterrupt);
-#endif
+    sigevent event = {};
+    event.sigev_notify = SIGEV_SIGNAL;
+    event.sigev_signo = SIGALRM;
+    std::signal(SIGALRM, endImpatiently);
+    hasTimer = hasTimer || timer_create(CLOCK_MONOTONIC, &event, &timer) == 0;
+    for (const int signal : {SIGINT, SIGTERM, SIGHUP}) {
+        handle(signal, noteInterrupt);
+    }
+    handle(SIGPIPE, endForClosedReader);
 }
 
 bool isInterrupted()
 {
-    return interrupted != 0;
+    return interrupted;
 }
 
 void setInterrupted(bool isSet)
 {
-    interrupted = isSet ? 1 : 0;
+    interrupted = isSet;
+}
+
+void endByInterrupt()
+{
+    if (interruptingSignal != 0) {
+        endBy(interruptingSignal);
+    }
+}
+
+void endByClosedReader()
+{
+    struct sigaction action = {};
+    sigaction(SIGPIPE, nullptr, &action);
+    if (action.sa_handler != SIG_IGN) {
+        endForClosedReader(SIGPIPE);
+    }
 }
 
 } // namespace kareport

@@ -17,6 +17,29 @@
 namespace kareport
 {
 
+namespace
+{
+
+/// Rows that end when the work is to stop.
+class StoppableList : public UDataObjectList
+{
+public:
+    explicit StoppableList(std::function<bool()> isStopped) : isStopped_(std::move(isStopped)) {}
+
+    UDataObject *GetAt(std::size_t index) override
+    {
+        const bool isEnd = index % rowsBetween == 0 && isStopped_();
+        return isEnd ? nullptr : UDataObjectList::GetAt(index);
+    }
+
+private:
+    static constexpr std::size_t rowsBetween = 256;
+
+    std::function<bool()> isStopped_;
+};
+
+} // namespace
+
 /// Carries out the steps of a job, one after the other.
 class JobRunner::Steps
 {
@@ -156,7 +179,7 @@ private:
     std::unique_ptr<UDataObjectList> readValues(const QString &name, const FindVariable &findVariable, bool firstOnly)
     {
         const JsonNode values = JsonNode(runner_.source_)["data"][name]["values"];
-        auto list = std::make_unique<UDataObjectList>();
+        auto list = std::make_unique<StoppableList>([this] { return runner_.isStopped(); });
         if (values.isObject()) {
             storeJsonObject(values, findVariable, list->Add());
             return list;
@@ -218,7 +241,7 @@ std::optional<InputError> JobRunner::run(ReportTextWriter *stream)
 
 bool JobRunner::isStopped() const
 {
-    return isInterrupted() || (stream_ != nullptr && stream_->hasFailed());
+    return isInterrupted() || (stream_ != nullptr && stream_->hasFailed()) || (isToStop_ && isToStop_());
 }
 
 std::optional<InputError> JobRunner::prepare()

@@ -34,6 +34,8 @@ public:
     ///                it has failed, no more is made
     /// @return what is wrong with the job's template or data; nothing when the report has been made or was interrupted
     std::optional<InputError> run(ReportTextWriter *stream = nullptr);
+    /// Is asked now and then, besides the interrupts, whether the work is to stop.
+    void stopWhen(std::function<bool()> isToStop) { isToStop_ = std::move(isToStop); }
     UReportDoc &report() { return *report_; }
     /// The same while it may not have been made: null then.
     UReportDoc *madeReport() { return report_; }
@@ -54,6 +56,7 @@ private:
     std::optional<UApplication> application_; ///< of a program that has none
     UReportDoc *report_ = nullptr;            ///< owned by its document template
     ReportTextWriter *stream_ = nullptr;
+    std::function<bool()> isToStop_;
 };
 
 } // namespace kareport

@@ -30,6 +30,7 @@ struct Output
 {
     QString file; ///< "-" for standard output
     OutputKind kind = OutputKind::Text;
+    std::optional<qint64> mostBytes = std::nullopt; ///< none when it may have any size
 
     bool isStandardOutput() const { return file == u"-"; }
 };

@@ -2,12 +2,15 @@
 
 #include "Interrupt.h"
 #include "PdfExport.h"
+#include "ProcessSetup.h"
 #include "ReplaceFile.h"
 #include "ReportContent.h"
 #include "RichTextWriter.h"
+#include "SizeLimit.h"
 #include "Xlate.h"
 
 #include <QFile>
+#include <QFileInfo>
 #include <QTextDocument>
 
 #include <cstdio>
@@ -17,6 +20,11 @@ namespace kareport
 
 namespace
 {
+
+QString tooLarge(const Output &output)
+{
+    return Xlate("\"%1\" was not written: it would have more than %2").arg(output.file, sizeText(*output.mostBytes));
+}
 
 /// Writes one report to one output.
 class OutputWriting
@@ -28,12 +36,11 @@ public:
 
     std::optional<QString> write()
     {
+        if (const auto wrong = wrongSize()) {
+            return wrong;
+        }
         if (output_.isStandardOutput()) {
-            QFile file;
-            const bool done = file.open(stdout, QIODevice::WriteOnly) && writeTo(file) && file.flush();
-            return done ? std::nullopt
-                        : std::optional(
-                              Xlate("the report could not be written to standard output: %1").arg(reason(file)));
+            return writeStandardOutput();
         }
         if (output_.kind == OutputKind::Report && report_.IsEmpty()) {
             // Saving an empty report makes no file.
@@ -44,7 +51,32 @@ public:
     }
 
 private:
-    QString reason(const QFile &file) const { return problem_.isEmpty() ? file.errorString() : problem_; }
+    std::optional<QString> writeStandardOutput()
+    {
+        QFile file;
+        if (file.open(stdout, QIODevice::WriteOnly) && writeTo(file) && file.flush()) {
+            return std::nullopt;
+        }
+        if (isOutputReaderGone()) {
+            endByClosedReader();
+            return QString();
+        }
+        return Xlate("the report could not be written to standard output: %1")
+            .arg(problem_.isEmpty() ? file.errorString() : problem_);
+    }
+
+    /// What is written piece by piece to where it cannot be taken back is measured before.
+    std::optional<QString> wrongSize()
+    {
+        const QFileInfo info(output_.file);
+        if (!output_.mostBytes || (!output_.isStandardOutput() && (info.isFile() || !info.exists()))) {
+            return std::nullopt;
+        }
+        SizeLimit count(nullptr, *output_.mostBytes);
+        const bool isTooLarge = !writeTo(count) && count.isExceeded();
+        warnings_.clear(); // they come again
+        return isTooLarge ? std::optional(tooLarge(output_)) : std::nullopt;
+    }
 
     bool writeTo(QIODevice &device)
     {
@@ -101,10 +133,21 @@ std::optional<QString> replaceOutput(const Output &output, const std::function<b
                                      const QString &problem)
 {
     QString error;
-    return replaceFile(output.file, write, &error)
-               ? std::nullopt
-               : std::optional(
-                     Xlate("\"%1\" could not be written: %2").arg(output.file, problem.isEmpty() ? error : problem));
+    bool isTooLarge = false;
+    const auto writeLimited = [&](QIODevice &device) {
+        SizeLimit limited(&device, *output.mostBytes);
+        const bool done = write(limited);
+        isTooLarge = limited.isExceeded();
+        return done;
+    };
+    const bool done =
+        output.mostBytes ? replaceFile(output.file, writeLimited, &error) : replaceFile(output.file, write, &error);
+    if (isTooLarge) {
+        return tooLarge(output);
+    }
+    return done ? std::nullopt
+                : std::optional(
+                      Xlate("\"%1\" could not be written: %2").arg(output.file, problem.isEmpty() ? error : problem));
 }
 
 std::optional<QString> writeOutput(UReportDoc &report, const Output &output, Progress &progress, QStringList &warnings)

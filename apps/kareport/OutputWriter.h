@@ -16,7 +16,7 @@ std::optional<QString> replaceOutput(const Output &output, const std::function<b
                                      const QString &problem = QString());
 
 /// Writes a report to where an output says. @param warnings  receives what a reader of the output should know
-/// @return what went wrong; nothing when it was written
+/// @return what went wrong, empty when nobody reads standard output any more; nothing when it was written
 std::optional<QString> writeOutput(UReportDoc &report, const Output &output, Progress &progress, QStringList &warnings);
 
 } // namespace kareport

@@ -29,7 +29,9 @@ bool needsFonts(const std::vector<Output> &outputs)
 ExitStatus sayWritten(const Output &output, const std::optional<QString> &error, bool isEmpty, bool quiet)
 {
     if (error) {
-        printError(QStringLiteral("kareport: ") + *error);
+        if (!error->isEmpty()) {
+            printError(QStringLiteral("kareport: ") + *error);
+        }
         return exitOutput;
     }
     if (!quiet && isEmpty && output.kind == OutputKind::Report) {

@@ -1,6 +1,9 @@
 #include "Progress.h"
 
+#include "VisibleText.h"
+
 #include <algorithm>
+#include <atomic>
 #include <cstdio>
 
 namespace kareport
@@ -11,7 +14,7 @@ namespace
 
 constexpr qint64 millisecondsBetween = 100;
 
-qsizetype shownWidth = 0; ///< of the line on standard error; there is one for all
+std::atomic<qsizetype> shownWidth = 0; ///< of the line on standard error; there is one for all
 
 } // namespace
 
@@ -22,6 +25,11 @@ void eraseProgress()
         std::fflush(stderr);
         shownWidth = 0;
     }
+}
+
+bool isProgressShown()
+{
+    return shownWidth > 0;
 }
 
 void Progress::begin(const QString &what, std::size_t total)
@@ -50,13 +58,13 @@ void Progress::advance(std::size_t done, std::size_t total)
 
 void Progress::show(std::size_t done)
 {
-    QString line = prefix_ + what_;
+    QString line = visibleText(prefix_ + what_);
     if (total_ > 0) {
         line += QStringLiteral(" %1 %").arg(std::min(done, total_) * 100 / total_);
     }
     std::fprintf(stderr, "\r%s", qUtf8Printable(line.leftJustified(shownWidth)));
     std::fflush(stderr);
-    shownWidth = std::max(shownWidth, line.size());
+    shownWidth = std::max<qsizetype>(shownWidth, line.size());
 }
 
 void Progress::finish()

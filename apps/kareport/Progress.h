@@ -10,6 +10,8 @@ namespace kareport
 
 /// Takes what is shown of any progress off standard error, so that something else can be printed.
 void eraseProgress();
+/// Whether there is something to take off. A signal's handler may ask.
+bool isProgressShown();
 
 /// Shows how far long work has come: on standard error, unless something else does.
 class Progress

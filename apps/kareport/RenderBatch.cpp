@@ -1,10 +1,10 @@
 #include "RenderBatch.h"
 
+#include "FileIdentity.h"
 #include "Interrupt.h"
+#include "OutputClash.h"
 #include "UpToDate.h"
 #include "Xlate.h"
-
-#include <QFileInfo>
 
 #include <algorithm>
 #include <new>
@@ -12,22 +12,16 @@
 namespace kareport
 {
 
-namespace
+void RenderBatch::keep(const QStringList &jobs, const QString &jobList)
 {
-
-/// The file that an output becomes, without links on the way; empty for what is no file and so loses nothing when it is
-/// written to twice.
-QString fileOf(const Output &output)
-{
-    const QFileInfo info(output.file);
-    if (output.isStandardOutput() || (info.exists() && !info.isFile())) {
-        return QString();
+    for (const QString &job : jobs) {
+        kept_.insert(fileIdentity(job), job);
     }
-    const QString folder = QFileInfo(info.absolutePath()).canonicalFilePath();
-    return info.exists() ? info.canonicalFilePath() : folder + u'/' + info.fileName();
+    if (!jobList.isEmpty() && jobList != u"-") {
+        kept_.insert(fileIdentity(jobList), jobList);
+    }
+    kept_.remove(QString()); // pipes
 }
-
-} // namespace
 
 ExitStatus RenderBatch::run(const QStringList &jobs)
 {
@@ -58,7 +52,7 @@ ExitStatus RenderBatch::run(const QStringList &jobs)
 ExitStatus RenderBatch::make(const QString &path)
 {
     RenderJob job(command_, JsonSource::read(path));
-    if (job.status() != exitDone || takesFileOfAnother(job)) {
+    if (job.status() != exitDone || takesFileOfAnother(job, path)) {
         return job.status();
     }
     if (command_.onlyOutdated && isUpToDate(job.job(), path)) {
@@ -74,11 +68,17 @@ ExitStatus RenderBatch::make(const QString &path)
     return status;
 }
 
-/// Whether an earlier job has written a file that this one writes too: one of the two reports would be lost.
-bool RenderBatch::takesFileOfAnother(RenderJob &job)
+/// Whether a file that a job writes was written by an earlier one, or is needed by another: one of the two would be lost.
+bool RenderBatch::takesFileOfAnother(RenderJob &job, const QString &path)
 {
     for (const Output &output : job.job().outputs) {
-        if (const auto writer = writers_.constFind(fileOf(output)); writer != writers_.constEnd()) {
+        const QString identity = outputIdentity(output);
+        if (const auto file = kept_.constFind(identity); file != kept_.constEnd() && *file != path) {
+            job.fail(Xlate("\"%1\" is the file \"%2\" of this batch: an output of its own was expected")
+                         .arg(output.file, *file));
+            return true;
+        }
+        if (const auto writer = writers_.constFind(identity); writer != writers_.constEnd()) {
             job.fail(Xlate("\"%1\" is written by the job \"%2\" already: an output of its own was expected")
                          .arg(output.file, *writer));
             return true;
@@ -90,8 +90,9 @@ bool RenderBatch::takesFileOfAnother(RenderJob &job)
 void RenderBatch::noteFiles(const Job &job, const QString &path)
 {
     for (const Output &output : job.outputs) {
-        if (const QString file = fileOf(output); !file.isEmpty()) {
-            writers_.insert(file, path);
+        const QString identity = output.isStandardOutput() ? QString() : outputIdentity(output);
+        if (!identity.isEmpty()) {
+            writers_.insert(identity, path);
         }
     }
 }

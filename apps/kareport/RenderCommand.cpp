@@ -4,6 +4,7 @@
 #include "JobList.h"
 #include "RenderBatch.h"
 #include "RenderJob.h"
+#include "SizeLimit.h"
 #include "UpToDate.h"
 #include "Xlate.h"
 
@@ -26,6 +27,9 @@ std::optional<QString> RenderCommand::usageError() const
 {
     auto wrong = wrongSource();
     wrong = wrong ? wrong : wrongKindName(as);
+    if (!wrong && limit && !sizeFromText(*limit)) {
+        return Xlate("--limit \"%1\": a number of bytes was expected, as in 500000, 800K, 20M or 1G").arg(*limit);
+    }
     return wrong ? wrong : wrongOutputs();
 }
 
@@ -77,7 +81,9 @@ ExitStatus RenderCommand::run(int &argc, char **argv) const
             all += std::get<QStringList>(listed);
         }
         const auto application = startQt(argc, argv, true);
-        return RenderBatch(*this).run(slice ? JobSlice::fromText(*slice)->of(all) : all);
+        RenderBatch batch(*this);
+        batch.keep(all, jobList);
+        return batch.run(slice ? JobSlice::fromText(*slice)->of(all) : all);
     }
     RenderJob job(*this, isShort() ? Expected<JsonSource>(JsonSource::fromObject(templateJob.toJson()))
                                    : JsonSource::read(jobs.first()));

@@ -3,8 +3,12 @@
 #include "CommandSetup.h"
 #include "Interrupt.h"
 #include "JobReader.h"
+#include "LeastSize.h"
+#include "OutputClash.h"
 #include "OutputWriter.h"
 #include "OutputsWriter.h"
+#include "ProcessSetup.h"
+#include "SizeLimit.h"
 #include "Xlate.h"
 
 #include <QFileInfo>
@@ -14,7 +18,16 @@
 namespace kareport
 {
 
-RenderJob::RenderJob(const RenderCommand &command, Expected<JsonSource> source) : command_(command)
+namespace
+{
+
+/// A report of so many bytes is worth a word before it is made.
+constexpr qint64 largeReport = qint64(100) << 20;
+
+} // namespace
+
+RenderJob::RenderJob(const RenderCommand &command, Expected<JsonSource> source)
+    : command_(command), limit_(command.limit ? sizeFromText(*command.limit) : std::nullopt)
 {
     if (const InputError *error = errorOf(source)) {
         fail(exitInput, error->message());
@@ -32,6 +45,7 @@ RenderJob::RenderJob(const RenderCommand &command, Expected<JsonSource> source) 
         return;
     }
     takeOutputs(kindOtherwise);
+    checkOutputs();
 }
 
 void RenderJob::takeOutputs(std::optional<OutputKind> kindOtherwise)
@@ -47,6 +61,58 @@ void RenderJob::takeOutputs(std::optional<OutputKind> kindOtherwise)
     } else if (job_.outputs.empty()) {
         job_.outputs.push_back({QStringLiteral("-"), *outputKindOf(QStringLiteral("-"), kindOtherwise)});
     }
+    for (Output &output : job_.outputs) {
+        output.mostBytes = limit_;
+    }
+}
+
+/// No output may take the place of what the report is made of, or of another output.
+void RenderJob::checkOutputs()
+{
+    const auto clash = outputClash(job_, source_.path());
+    if (!clash) {
+        return;
+    }
+    const JsonNode output = JsonNode(source_)["output"];
+    if (command_.outputs.isEmpty() && output.exists()) {
+        output[clash->output].fail(clash->text);
+        fail(exitInput, source_.error()->message());
+    } else {
+        fail(clash->text);
+    }
+}
+
+/// Says how large the report will be at least, where that is much or too much.
+ExitStatus RenderJob::checkSize()
+{
+    const qint64 least = leastSize(job_);
+    if (limit_ && least > *limit_) {
+        return failTooLarge(least);
+    }
+    if (least >= largeReport && !command_.quiet) {
+        printError(Xlate("kareport: the report will have at least %1").arg(sizeText(least)));
+    }
+    return exitDone;
+}
+
+ExitStatus RenderJob::failTooLarge(qint64 bytes)
+{
+    return fail(exitOutput,
+                Xlate("kareport: nothing was written: the report has at least %1, more than the limit of %2")
+                    .arg(sizeText(bytes), sizeText(*limit_)));
+}
+
+/// Whether the text exceeds the limit also when every second character is one that plain text does without.
+bool RenderJob::isTooLarge(const UReportDoc *report) const
+{
+    return limit_ && report != nullptr && report->GetTextLength() / 2 > *limit_;
+}
+
+bool RenderJob::isReaderGone() const
+{
+    return std::any_of(job_.outputs.begin(), job_.outputs.end(),
+                       [](const Output &output) { return output.isStandardOutput(); }) &&
+           isOutputReaderGone();
 }
 
 bool RenderJob::needsFonts() const
@@ -81,13 +147,20 @@ const Output *RenderJob::streamedOutput() const
     return job_.outputs.size() == 1 && isText && isFile && !isEmptied ? &output : nullptr;
 }
 
-ExitStatus RenderJob::madeStatus(const std::optional<InputError> &error)
+ExitStatus RenderJob::madeStatus(JobRunner &runner, const std::optional<InputError> &error)
 {
     if (isInterrupted()) {
         if (!command_.isBatch()) {
             printError(Xlate("kareport: stopped; nothing was written"));
         }
         return exitInterrupted;
+    }
+    if (isReaderGone()) {
+        endByClosedReader();
+        return exitOutput;
+    }
+    if (isTooLarge(runner.madeReport())) {
+        return failTooLarge(runner.report().GetTextLength() / 2);
     }
     return error ? fail(exitInput, error->message()) : exitDone;
 }
@@ -121,12 +194,16 @@ std::optional<ExitStatus> RenderJob::runIntoOutput(JobRunner &runner, const Outp
     progress.finish();
     // What comes when the report is made is too late to stop it.
     return isMade ? sayWritten(output, isEmpty && isReport ? std::nullopt : outputError, isEmpty, command_.quiet)
-                  : madeStatus(inputError);
+                  : madeStatus(runner, inputError);
 }
 
 ExitStatus RenderJob::run(Progress &progress)
 {
+    if (checkSize() != exitDone) {
+        return status_;
+    }
     JobRunner runner(job_, source_, progress);
+    runner.stopWhen([this, &runner] { return isReaderGone() || isTooLarge(runner.madeReport()); });
     if (const Output *output = streamedOutput()) {
         if (const auto status = runIntoOutput(runner, *output, progress)) {
             return status_ = *status;
@@ -134,7 +211,7 @@ ExitStatus RenderJob::run(Progress &progress)
     }
     const auto error = runner.run();
     progress.finish();
-    status_ = madeStatus(error);
+    status_ = madeStatus(runner, error);
     if (status_ == exitDone) {
         status_ = writeOutputs(runner.report(), job_.outputs, progress, command_.quiet);
     }

@@ -29,14 +29,20 @@ public:
 private:
     const Output *streamedOutput() const;
     /// How making the report ended, before its outputs are looked at.
-    ExitStatus madeStatus(const std::optional<InputError> &error);
+    ExitStatus madeStatus(JobRunner &runner, const std::optional<InputError> &error);
     std::optional<ExitStatus> runIntoOutput(JobRunner &runner, const Output &output, Progress &progress);
     void takeOutputs(std::optional<OutputKind> kindOtherwise);
+    void checkOutputs();
+    ExitStatus checkSize();
+    bool isTooLarge(const UReportDoc *report) const;
+    bool isReaderGone() const;
+    ExitStatus failTooLarge(qint64 bytes);
     ExitStatus fail(ExitStatus status, const QString &message);
 
     const RenderCommand &command_;
     JsonSource source_;
     Job job_;
+    std::optional<qint64> limit_; ///< bytes that neither the text nor an output may exceed
     ExitStatus status_ = exitDone;
 };
 

@@ -8,6 +8,10 @@
 namespace kareport
 {
 
+RowBatches::RowBatches(std::function<void(RowBatch &)> fill)
+    : fill_(std::move(fill)), noMemory_{QString(), std::nullopt, Xlate("there is not enough memory for the data")}
+{}
+
 RowBatches::~RowBatches()
 {
     thread_.request_stop();
@@ -20,7 +24,7 @@ void RowBatches::fill(RowBatch &batch)
     try {
         fill_(batch);
     } catch (const std::bad_alloc &) {
-        batch.error = InputError{QString(), std::nullopt, Xlate("there is not enough memory for the data")};
+        batch.error = noMemory_;
         batch.isLast = true;
     }
 }
@@ -53,6 +57,8 @@ const RowBatch &RowBatches::next()
                 thread_ = std::jthread([this](const std::stop_token &stop) { readAhead(stop); });
             } catch (const std::system_error &) {
                 isAlone_ = true; // the user has as many threads as are allowed: then without one
+            } catch (const std::bad_alloc &) {
+                isAlone_ = true;
             }
         }
         return batch;

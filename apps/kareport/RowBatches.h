@@ -43,7 +43,7 @@ class RowBatches
 public:
     /// @param fill  reads the next rows into a batch. It is called on a thread of its own but for the first batch, never
     ///              twice at a time, and not any more after the last batch
-    explicit RowBatches(std::function<void(RowBatch &)> fill) : fill_(std::move(fill)) {}
+    explicit RowBatches(std::function<void(RowBatch &)> fill);
     ~RowBatches();
     RowBatches(const RowBatches &) = delete;
     RowBatches &operator=(const RowBatches &) = delete;
@@ -56,6 +56,7 @@ private:
     void readAhead(const std::stop_token &stop);
 
     std::function<void(RowBatch &)> fill_;
+    InputError noMemory_; ///< made while there is memory: copying it takes none
     std::array<RowBatch, 2> batches_;
     std::size_t used_ = 1;               ///< the batch that was handed out last
     bool isAlone_ = false;               ///< no thread could be had

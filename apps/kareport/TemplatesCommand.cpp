@@ -128,7 +128,10 @@ void printTemplate(const QJsonObject &description)
 
 void printJson(const QJsonDocument &document)
 {
-    printLine(QString::fromUtf8(document.toJson(QJsonDocument::Indented)).trimmed());
+    const QString text = QString::fromUtf8(document.toJson(QJsonDocument::Indented)).trimmed();
+    for (const QString &line : text.split(u'\n')) {
+        printLine(line);
+    }
 }
 
 } // namespace

@@ -1,11 +1,14 @@
 #include "Commands.h"
+#include "Interrupt.h"
 #include "OutputKind.h"
+#include "ProcessSetup.h"
 
 #include <CLI/CLI.hpp>
 
 #include <cstdio>
 #include <new>
 #include <optional>
+#include <sstream>
 #include <string>
 #include <vector>
 
@@ -48,6 +51,7 @@ struct RenderOptions
     std::vector<std::string> outputs;
     std::string as;
     std::vector<std::string> sets;
+    std::optional<std::string> limit;
     bool progress = false;
     bool quiet = false;
 
@@ -61,6 +65,7 @@ struct RenderOptions
                 texts(outputs),
                 text(as),
                 texts(sets),
+                limit ? std::optional(text(*limit)) : std::nullopt,
                 progress,
                 quiet};
     }
@@ -100,6 +105,10 @@ CLI::App *addRender(CLI::App &program, RenderOptions &options)
         ->add_option("--set", options.sets, "Set a key of the job, as settings.lengthUnit=ft. May stand several times")
         ->type_name("KEY=VALUE")
         ->allow_extra_args(false);
+    render
+        ->add_option("--limit", options.limit,
+                     "Write no report whose text, and no output that, becomes larger, as 20M (K, M, G, or bytes)")
+        ->type_name("SIZE");
     render->add_flag("--progress", options.progress, "Show how far the work has come");
     render->add_flag("--quiet", options.quiet, "Say nothing but errors");
     render->footer(
@@ -164,6 +173,23 @@ int runReportCommand(const Command &command, const char *name, int argc, char **
     return command.run(argc, argv);
 }
 
+/// Prints the help, or what is wrong with the command line and with which of its words.
+int exitParsing(const CLI::App &program, const CLI::ParseError &error)
+{
+    std::ostringstream out;
+    std::ostringstream wrong;
+    const int status = program.exit(error, out, wrong);
+    const auto print = [](const std::ostringstream &stream, void (*printOne)(const QString &)) {
+        const QString all = text(stream.str());
+        for (const QString &line : all.isEmpty() ? QStringList() : all.chopped(1).split(u'\n')) {
+            printOne(line);
+        }
+    };
+    print(out, kareport::printLine);
+    print(wrong, kareport::printError);
+    return status == 0 ? 0 : exitUsage;
+}
+
 int runProgram(int argc, char **argv)
 {
     CLI::App program("Fixed-pitch reports for civil engineering and surveying");
@@ -204,7 +230,7 @@ int runProgram(int argc, char **argv)
     try {
         program.parse(argc, argv);
     } catch (const CLI::ParseError &error) {
-        return program.exit(error) == 0 ? 0 : exitUsage;
+        return exitParsing(program, error);
     }
 
     if (renderCommand->parsed()) {
@@ -226,16 +252,23 @@ int runProgram(int argc, char **argv)
 
 int main(int argc, char **argv)
 {
+    kareport::prepareProcess();
     int status = 0;
     try {
         status = runProgram(argc, argv);
     } catch (const std::bad_alloc &) {
-        kareport::printError(QStringLiteral("kareport: error: there is not enough memory for this input"));
+        // Without memory, no text can be put together either.
+        std::fputs("kareport: error: there is not enough memory for this input\n", stderr);
         return kareport::exitInput;
+    }
+    if (status == kareport::exitInterrupted) {
+        kareport::endByInterrupt();
     }
     // A full disk behind standard output shows when the last of it is written.
     if (std::fflush(stdout) != 0 || std::ferror(stdout) != 0) {
-        kareport::printError(QStringLiteral("kareport: standard output could not be written"));
+        if (!kareport::isOutputReaderGone()) {
+            kareport::printError(QStringLiteral("kareport: standard output could not be written"));
+        }
         return status == kareport::exitDone ? kareport::exitOutput : status;
     }
     return status;

@@ -1,0 +1,31 @@
+#pragma once
+
+#include <atomic>
+#include <cstddef>
+#include <string_view>
+
+namespace kareport
+{
+
+/// A file's bytes, mapped into memory. Where somebody cuts the file short while it is read, or the disk fails, its lost
+/// part reads as zeros, and `isLost` says so: that must be asked before what was read is believed.
+class MappedFile
+{
+public:
+    MappedFile() = default;
+    ~MappedFile();
+    MappedFile(const MappedFile &) = delete;
+    MappedFile &operator=(const MappedFile &) = delete;
+
+    /// @return whether the file could be mapped
+    bool map(int handle, std::size_t size);
+    std::string_view view() const { return {begin_, size_}; }
+    bool isLost() const;
+
+private:
+    char *begin_ = nullptr;
+    std::size_t size_ = 0;
+    std::size_t slot_ = 0;
+};
+
+} // namespace kareport

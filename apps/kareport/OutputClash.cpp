@@ -1,0 +1,67 @@
+#include "OutputClash.h"
+
+#include "FileIdentity.h"
+#include "TemplateSource.h"
+#include "Xlate.h"
+
+#include <QHash>
+
+namespace kareport
+{
+
+namespace
+{
+
+/// The files that a job is made of, with the text that an output in their place gets.
+QHash<QString, QString> sourcesOf(const Job &job, const QString &path)
+{
+    QHash<QString, QString> sources;
+    for (const Job::DataSet &set : job.data) {
+        if (!set.csv.isEmpty()) {
+            sources.insert(fileIdentity(set.csv),
+                           Xlate("\"%1\" is data of the job: an output of its own was expected"));
+        }
+    }
+    if (job.reportTemplate) {
+        sources.insert(fileIdentity(templatePath(job)),
+                       Xlate("\"%1\" is the template of the job: an output of its own was expected"));
+    }
+    if (!path.isEmpty()) {
+        sources.insert(fileIdentity(path), Xlate("\"%1\" is the job itself: an output of its own was expected"));
+    }
+    return sources;
+}
+
+} // namespace
+
+QString outputIdentity(const Output &output)
+{
+    return output.isStandardOutput() ? standardOutputIdentity() : fileIdentity(output.file);
+}
+
+std::optional<OutputClash> outputClash(const Job &job, const QString &path)
+{
+    const QHash<QString, QString> sources = sourcesOf(job, path);
+    QHash<QString, const Output *> earlier;
+    for (qsizetype i = 0; i < qsizetype(job.outputs.size()); ++i) {
+        const Output &output = job.outputs[static_cast<std::size_t>(i)];
+        const QString identity = outputIdentity(output);
+        if (identity.isEmpty()) {
+            continue;
+        }
+        if (const auto source = sources.constFind(identity); source != sources.constEnd()) {
+            return OutputClash{i, source->arg(output.file)};
+        }
+        const Output *other = earlier.value(identity);
+        // One behind the other, both reports stand in standard output.
+        if (other != nullptr && !(other->isStandardOutput() && output.isStandardOutput())) {
+            return OutputClash{
+                i, Xlate("\"%1\" is the file of the output \"%2\" already: an output of its own was expected")
+                       .arg(output.file, other->file)};
+        }
+        earlier.insert(identity, &output);
+    }
+    return std::nullopt;
+}
+
+} // namespace kareport

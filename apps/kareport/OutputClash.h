@@ -1,0 +1,26 @@
+#pragma once
+
+#include "Job.h"
+
+#include <QString>
+
+#include <optional>
+
+namespace kareport
+{
+
+/// An output that would take the place of something that is needed.
+struct OutputClash
+{
+    qsizetype output; ///< its number among the job's outputs
+    QString text;     ///< a sentence that says what was expected
+};
+
+/// The file that an output becomes, as `fileIdentity` tells it.
+QString outputIdentity(const Output &output);
+
+/// The first output of a job that is the job file, its template or its data, or that another output is already.
+/// @param path  the job file; empty for a job that stands in no file
+std::optional<OutputClash> outputClash(const Job &job, const QString &path);
+
+} // namespace kareport

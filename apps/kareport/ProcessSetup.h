@@ -1,0 +1,16 @@
+#pragma once
+
+namespace kareport
+{
+
+/// Makes the process independent of what its caller left to it. It comes before anything is opened.
+///
+/// Closed descriptors of standard input, output and error are taken, so that no file that is opened later becomes one of
+/// them, and in the wrong direction, so that using them fails as it would have. A file that grows beyond the user's limit is
+/// a failed write, as on a full disk, and not the end of the process.
+void prepareProcess();
+
+/// Whether standard output leads to a pipe that nobody reads any more.
+bool isOutputReaderGone();
+
+} // namespace kareport
