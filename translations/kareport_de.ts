@@ -4,6 +4,16 @@
 <context>
     <name>KaReport</name>
     <message>
+        <location filename="../host/app/LinkTargetPosix.cpp"/>
+        <source>the link "%1" belongs to another user and stands in a folder that everybody can write to</source>
+        <translation>Die Verknüpfung „%1“ gehört einem anderen Benutzer und steht in einem Ordner, in den jeder schreiben kann</translation>
+    </message>
+    <message>
+        <location filename="../host/app/ReplaceFile.cpp"/>
+        <source>not all of it could be written</source>
+        <translation>nicht alles konnte geschrieben werden</translation>
+    </message>
+    <message>
         <location filename="../host/app/StandardText.cpp"/>
         <source>All Files (*.*)</source>
         <translation>Alle Dateien (*.*)</translation>
@@ -712,6 +722,11 @@
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
+        <source>the output "%1" is the report that is read: another one was expected</source>
+        <translation>Die Ausgabe „%1“ ist der Bericht, der gelesen wird: eine andere wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>--set: %1</source>
         <translation>--set: %1</translation>
     </message>
@@ -781,14 +796,14 @@
         <translation>die Zeile ist länger als %1 Byte: eine Tabelle aus Zeilen wurde erwartet</translation>
     </message>
     <message>
-        <location filename="../apps/kareport/FileBytes.cpp"/>
-        <source>more than %1 MB come out of what is no file</source>
-        <translation>mehr als %1 MB kommen aus einer Quelle, die keine Datei ist</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/FileBytes.cpp"/>
+        <location filename="../apps/kareport/FileBytesPosix.cpp"/>
         <source>the file was cut short while it was read</source>
         <translation>die Datei wurde beim Lesen abgeschnitten</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/FileBytesPosix.cpp"/>
+        <source>more than %1 MB come out of what is no file</source>
+        <translation>mehr als %1 MB kommen aus einer Quelle, die keine Datei ist</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobList.cpp"/>
@@ -1051,6 +1066,31 @@
         <translation>der Wert von „%1“ passt nicht: %2 wurde erwartet</translation>
     </message>
     <message>
+        <location filename="../apps/kareport/OutputClash.cpp"/>
+        <source>"%1" is data of the job: an output of its own was expected</source>
+        <translation>„%1“ enthält Daten des Auftrags: eine eigene Ausgabe wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/OutputClash.cpp"/>
+        <source>"%1" is the template of the job: an output of its own was expected</source>
+        <translation>„%1“ ist die Vorlage des Auftrags: eine eigene Ausgabe wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/OutputClash.cpp"/>
+        <source>"%1" is the job itself: an output of its own was expected</source>
+        <translation>„%1“ ist der Auftrag selbst: eine eigene Ausgabe wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/OutputClash.cpp"/>
+        <source>"%1" is the file of the output "%2" already: an output of its own was expected</source>
+        <translation>„%1“ ist schon die Datei der Ausgabe „%2“: eine eigene Ausgabe wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/OutputWriter.cpp"/>
+        <source>"%1" was not written: it would have more than %2</source>
+        <translation>„%1“ wurde nicht geschrieben: die Datei hätte mehr als %2</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/OutputWriter.cpp"/>
         <source>the report could not be written to standard output: %1</source>
         <translation>der Bericht konnte nicht in die Standardausgabe geschrieben werden: %1</translation>
@@ -1087,6 +1127,11 @@
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>
+        <source>"%1" is the file "%2" of this batch: an output of its own was expected</source>
+        <translation>„%1“ ist die Datei „%2“ dieses Stapels: eine eigene Ausgabe wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderBatch.cpp"/>
         <source>"%1" is written by the job "%2" already: an output of its own was expected</source>
         <translation>„%1“ wird schon vom Auftrag „%2“ geschrieben: eine eigene Ausgabe wurde erwartet</translation>
     </message>
@@ -1117,6 +1162,11 @@
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
+        <source>--limit "%1": a number of bytes was expected, as in 500000, 800K, 20M or 1G</source>
+        <translation>--limit „%1“: eine Zahl von Bytes wurde erwartet, wie 500000, 800K, 20M oder 1G</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderCommand.cpp"/>
         <source>either job files or --template, --name, --table or --block, and --data were expected</source>
         <translation>entweder Auftragsdateien oder --template, --name, --table oder --block und --data wurden erwartet</translation>
     </message>
@@ -1144,6 +1194,16 @@
         <location filename="../apps/kareport/RenderCommand.cpp"/>
         <source>kareport: all is up to date; nothing was written</source>
         <translation>kareport: alles ist auf dem neuesten Stand; nichts wurde geschrieben</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderJob.cpp"/>
+        <source>kareport: the report will have at least %1</source>
+        <translation>kareport: der Bericht wird mindestens %1 haben</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderJob.cpp"/>
+        <source>kareport: nothing was written: the report has at least %1, more than the limit of %2</source>
+        <translation>kareport: nichts wurde geschrieben: der Bericht hat mindestens %1, mehr als die Grenze von %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderJob.cpp"/>

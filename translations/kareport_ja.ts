@@ -4,6 +4,16 @@
 <context>
     <name>KaReport</name>
     <message>
+        <location filename="../host/app/LinkTargetPosix.cpp"/>
+        <source>the link "%1" belongs to another user and stands in a folder that everybody can write to</source>
+        <translation>リンク "%1" は別のユーザーのもので、だれでも書き込めるフォルダーにあります</translation>
+    </message>
+    <message>
+        <location filename="../host/app/ReplaceFile.cpp"/>
+        <source>not all of it could be written</source>
+        <translation>すべてを書き込むことはできませんでした</translation>
+    </message>
+    <message>
         <location filename="../host/app/StandardText.cpp"/>
         <source>All Files (*.*)</source>
         <translation>すべてのファイル (*.*)</translation>
@@ -712,6 +722,11 @@
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
+        <source>the output "%1" is the report that is read: another one was expected</source>
+        <translation>出力 "%1" は読み込むレポートそのものです: 別の出力が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>--set: %1</source>
         <translation>--set: %1</translation>
     </message>
@@ -781,14 +796,14 @@
         <translation>行が %1 バイトを超えています: 行からなる表が必要です</translation>
     </message>
     <message>
-        <location filename="../apps/kareport/FileBytes.cpp"/>
-        <source>more than %1 MB come out of what is no file</source>
-        <translation>ファイルではない入力から %1 MB を超えるデータが読み込まれました</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/FileBytes.cpp"/>
+        <location filename="../apps/kareport/FileBytesPosix.cpp"/>
         <source>the file was cut short while it was read</source>
         <translation>読み込み中にファイルが切り詰められました</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/FileBytesPosix.cpp"/>
+        <source>more than %1 MB come out of what is no file</source>
+        <translation>ファイルではない入力から %1 MB を超えるデータが読み込まれました</translation>
     </message>
     <message>
         <location filename="../apps/kareport/JobList.cpp"/>
@@ -1051,6 +1066,31 @@
         <translation>「%1」の値が不正です: %2が必要です</translation>
     </message>
     <message>
+        <location filename="../apps/kareport/OutputClash.cpp"/>
+        <source>"%1" is data of the job: an output of its own was expected</source>
+        <translation>"%1" はジョブのデータです: 別の出力が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/OutputClash.cpp"/>
+        <source>"%1" is the template of the job: an output of its own was expected</source>
+        <translation>"%1" はジョブのテンプレートです: 別の出力が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/OutputClash.cpp"/>
+        <source>"%1" is the job itself: an output of its own was expected</source>
+        <translation>"%1" はジョブそのものです: 別の出力が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/OutputClash.cpp"/>
+        <source>"%1" is the file of the output "%2" already: an output of its own was expected</source>
+        <translation>"%1" はすでに出力 "%2" のファイルです: 別の出力が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/OutputWriter.cpp"/>
+        <source>"%1" was not written: it would have more than %2</source>
+        <translation>"%1" は書き込まれませんでした: %2 を超えます</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/OutputWriter.cpp"/>
         <source>the report could not be written to standard output: %1</source>
         <translation>帳票を標準出力に書き込めませんでした: %1</translation>
@@ -1087,6 +1127,11 @@
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>
+        <source>"%1" is the file "%2" of this batch: an output of its own was expected</source>
+        <translation>"%1" はこの一括処理のファイル "%2" です: 別の出力が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderBatch.cpp"/>
         <source>"%1" is written by the job "%2" already: an output of its own was expected</source>
         <translation>"%1" はジョブ "%2" がすでに書き込んでいます: 別の出力が必要です</translation>
     </message>
@@ -1117,6 +1162,11 @@
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
+        <source>--limit "%1": a number of bytes was expected, as in 500000, 800K, 20M or 1G</source>
+        <translation>--limit "%1": 500000、800K、20M、1G のようなバイト数が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderCommand.cpp"/>
         <source>either job files or --template, --name, --table or --block, and --data were expected</source>
         <translation>ジョブファイル、または --template、--name、--table か --block、および --data が必要です</translation>
     </message>
@@ -1144,6 +1194,16 @@
         <location filename="../apps/kareport/RenderCommand.cpp"/>
         <source>kareport: all is up to date; nothing was written</source>
         <translation>kareport: すべて最新です。何も書き込みませんでした</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderJob.cpp"/>
+        <source>kareport: the report will have at least %1</source>
+        <translation>kareport: レポートは少なくとも %1 になります</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderJob.cpp"/>
+        <source>kareport: nothing was written: the report has at least %1, more than the limit of %2</source>
+        <translation>kareport: 何も書き込まれませんでした: レポートは少なくとも %1 で、上限の %2 を超えます</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderJob.cpp"/>
