@@ -21,7 +21,7 @@
 namespace
 {
 
-const QString markup = QStringLiteral("<img src=\"file:///dev/zero\"> & <b>bold</b>");
+const QString markup = QStringLiteral("<img src=\"file:///gone.png\"> & <b>bold</b>");
 
 /// Answers the next message box by a key, and says what it looked like.
 class AnsweredBox
