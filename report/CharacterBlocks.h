@@ -12,11 +12,12 @@
 namespace kareport
 {
 
-/// A growing run of characters with a 0 behind the last. Its capacity is counted in blocks and zeroed block by block;
+/// A growing run of characters with a 0 after the last. Its capacity is counted in blocks and zeroed block by block;
 /// the memory behind it grows geometrically, so that a text of any length is copied a constant number of times.
 ///
-/// What is free lies behind the last character or, while pieces are replaced, as a gap where the last one was: pieces
-/// that are replaced from the front to the back move the text once. Whoever reads the text closes the gap.
+/// What is free lies after the last character or, while pieces are replaced, as a gap where the last one was: pieces
+/// that are replaced from the front to the back move the text once. Reading the text in one piece closes the gap, and so
+/// does growing, which makes new room at the end.
 template <typename Character>
 class CharacterBlocks
 {
@@ -44,7 +45,7 @@ public:
     }
     qint64 size() const { return size_; }
 
-    /// Makes room for so many characters and the 0 behind them.
+    /// Makes room for so many characters and the 0 after them.
     bool reserve(qint64 characters) { return characters <= usable_ || grow(characters); }
     /// Takes characters over that were written behind the last one, within what was reserved.
     void setSize(qint64 size)
@@ -59,11 +60,8 @@ public:
     bool replace(qint64 at, qint64 removed, const Source *inserted, qint64 count)
     {
         const qint64 size = size_ - removed + count;
-        if (size > usable_) {
-            data(); // growing keeps what lies in one piece
-            if (!grow(size)) {
-                return false;
-            }
+        if (!reserve(size)) {
+            return false;
         }
         if (gapAt_ < at) {
             moveGap(at);
@@ -78,6 +76,18 @@ public:
             data_[size_] = Character(0);
         }
         return true;
+    }
+    /// Hands on a part of the text as it lies, in one piece or two, moving nothing. @param take  is given an address and a
+    /// number of characters, never 0
+    template <typename Take>
+    void forEachPiece(qint64 begin, qint64 end, Take take) const
+    {
+        if (begin < std::min(end, gapAt_)) {
+            take(data_ + begin, std::min(end, gapAt_) - begin);
+        }
+        if (std::max(begin, gapAt_) < end) {
+            take(data_ + std::max(begin, gapAt_) + (usable_ - size_), end - std::max(begin, gapAt_));
+        }
     }
     /// Whether an address lies in the memory of this text.
     bool holds(const Character *address) const
@@ -125,6 +135,8 @@ private:
         if (counted > allocated_ && !allocate(std::max(counted, allocated_ * 2)) && !allocate(counted)) {
             return false;
         }
+        // What is new is at the end of all that is usable: a gap would take a part of the text for it.
+        data();
         const qint64 firstNew = usable_ == 0 ? size_ : usable_ + 1;
         std::fill(data_ + firstNew, data_ + counted + 1, Character(0));
         usable_ = counted;

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "KaReportExport.h"
+#include "MemoryLasts.h"
 #include "PageStarts.h"
 #include "ReportText.h"
 #include "ReportTextCodec.h"
@@ -21,10 +22,11 @@ public:
     virtual ~PageWriterObserver();
     /// Whether it wants the text of what is written. Otherwise it need only be told that something was.
     virtual bool takesText() const { return true; }
-    /// A piece of text, never empty, with the style it was written in.
-    virtual void textWritten(QStringView text, int style) = 0;
-    /// A line end that is no part of a piece.
-    virtual void lineEnded() = 0;
+    /// A piece of text, never empty, with the style it was written in. @return false when there is no memory for it: it is
+    /// then not written at all
+    virtual bool textWritten(QStringView text, int style) = 0;
+    /// A line end that is no part of a piece. @return false as above
+    virtual bool lineEnded() = 0;
     /// A line, a heading or a page header was written.
     virtual void changed() = 0;
 };
@@ -41,6 +43,9 @@ struct PageHeading
 class KAREPORT_EXPORT PageWriter
 {
 public:
+    /// The characters after which the text is handed to an outlet: few enough to be near the processor.
+    static constexpr qint64 mostBeforeOutlet = 256 * 1024;
+
     /// The observer may be null; otherwise it must live as long as the writer.
     explicit PageWriter(PageWriterObserver *observer = nullptr, ReportText::Reallocate reallocate = nullptr);
 
@@ -60,9 +65,21 @@ public:
     /// @return false, changing nothing, for a piece that is not in the text or when there is no memory
     bool replace(qint64 at, qint64 removed, QStringView inserted);
 
-    /// Whether a part of what was to be written since the last `clear` is missing, for want of memory.
-    bool hasLostText() const { return hasLostText_; }
-    void noteLostText() { hasLostText_ = true; }
+    /// Whether a part of what was to be written since the last `clear` is missing, because memory has ended.
+    bool hasLostText() const { return losses_ != 0; }
+    void noteLostText() { ++losses_; }
+    /// How often something was lost.
+    quint64 losses() const { return losses_; }
+    /// Does something that writes; where memory ends in the middle, what comes then is lost. @return whether nothing was
+    template <typename Write>
+    bool losesNothing(Write write)
+    {
+        const quint64 before = losses_;
+        if (!doneWhileMemoryLasts(write)) {
+            noteLostText();
+        }
+        return losses_ == before;
+    }
 
     int lineNumber() const { return lineNumber_; } ///< line on the page; 1 right after a page break
     int lineCount() const
@@ -109,15 +126,21 @@ public:
     void noteChange();
 
 private:
-    static constexpr int headerGap = 4;                    ///< line ends behind the header line
-    static constexpr qint64 mostBeforeOutlet = 256 * 1024; ///< characters: few enough to be near the processor
+    static constexpr int headerGap = 4; ///< line ends after the header line
 
     template <typename View>
     bool writeText(View text, int style);
     template <typename View>
+    bool tellWritten(View text, int style);
+    template <typename View>
     void writeTextLine(View text, int linesBefore, int linesAfter, int style);
 
     void notePageStart();
+    void takeBack(qint64 size)
+    {
+        text_.truncate(size);
+        noteLostText();
+    }
     void noteGrowth()
     {
         if (outlet_ != nullptr && text_.size() >= mostBeforeOutlet) {
@@ -129,7 +152,7 @@ private:
     ReportText text_;
     PageStarts starts_;
     ReportTextWriter *outlet_ = nullptr;
-    bool hasLostText_ = false;
+    quint64 losses_ = 0;
     int lineNumber_ = 0;
     qint64 lineCount_ = 0; ///< a report that is handed on may have any number
     int pageNumber_ = 0;

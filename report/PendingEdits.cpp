@@ -7,11 +7,16 @@ namespace kareport
 
 void PendingEdits::replace(qint64 at, qint64 removed, QStringView inserted)
 {
-    const qint64 end = at + removed;
+    // The edits change first: without memory for that, nothing has changed.
+    replaceInEdits(at, removed, inserted);
     growth_ += inserted.size() - removed;
     inserted_ += inserted.size();
+}
 
-    // The first edit that ends at the place or behind it, and by how much those before it shift the text.
+void PendingEdits::replaceInEdits(qint64 at, qint64 removed, QStringView inserted)
+{
+    const qint64 end = at + removed;
+    // The first edit that ends at the place or after it, and by how much those before it shift the text.
     qint64 shift = 0;
     auto first = edits_.begin();
     while (first != edits_.end() && first->at + shift + first->inserted.size() < at) {

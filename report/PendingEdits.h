@@ -20,7 +20,7 @@ public:
         QString inserted;
     };
 
-    /// Adds the replacement of a piece of the edited text.
+    /// Adds the replacement of a piece of the edited text. @throws std::bad_alloc, with the edits as they were
     void replace(qint64 at, qint64 removed, QStringView inserted);
     /// In the order of their places.
     const std::vector<Edit> &edits() const { return edits_; }
@@ -33,6 +33,8 @@ public:
     void clear();
 
 private:
+    void replaceInEdits(qint64 at, qint64 removed, QStringView inserted);
+
     std::vector<Edit> edits_;
     qint64 growth_ = 0;
     qint64 inserted_ = 0;

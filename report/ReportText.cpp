@@ -1,5 +1,7 @@
 #include "ReportText.h"
 
+#include "MemoryLasts.h"
+
 #include <QString>
 
 #include <algorithm>
@@ -93,18 +95,15 @@ bool ReportText::owns(QLatin1StringView text) const
 bool ReportText::append(QLatin1StringView text)
 {
     settle();
-    if (size() + text.size() > longest) {
-        return false;
-    }
-    if (owns(text)) {
-        return append(QStringView(QString(text)));
-    }
-    if (!reserve(size() + text.size())) {
-        return false;
-    }
     const auto *bytes = reinterpret_cast<const unsigned char *>(text.data());
+    // Growing may move the text that the piece is a piece of.
+    const qint64 own = owns(text) ? bytes - narrow_.data() : -1;
+    if (size() + text.size() > longest || !reserve(size() + text.size())) {
+        return false;
+    }
     if (isNarrow_) {
-        std::copy_n(bytes, text.size(), narrow_.data() + narrow_.size());
+        unsigned char *end = narrow_.data() + narrow_.size();
+        std::copy_n(own >= 0 ? narrow_.data() + own : bytes, text.size(), end);
         narrow_.setSize(narrow_.size() + text.size());
     } else {
         std::copy_n(bytes, text.size(), wide_.data() + wide_.size());
@@ -116,15 +115,10 @@ bool ReportText::append(QLatin1StringView text)
 bool ReportText::append(QStringView text)
 {
     settle();
-    if (size() + text.size() > longest) {
+    if (size() + text.size() > longest || (isNarrow_ && !isLatin1(text) && !widen())) {
         return false;
     }
-    if (owns(text)) {
-        return append(text.toString());
-    }
-    if (isNarrow_ && !isLatin1(text) && !widen()) {
-        return false;
-    }
+    const qint64 own = owns(text) ? text.utf16() - wide_.data() : -1;
     if (!reserve(size() + text.size())) {
         return false;
     }
@@ -133,7 +127,8 @@ bool ReportText::append(QStringView text)
                        [](char16_t character) { return static_cast<unsigned char>(character); });
         narrow_.setSize(narrow_.size() + text.size());
     } else {
-        std::copy_n(text.utf16(), text.size(), wide_.data() + wide_.size());
+        char16_t *end = wide_.data() + wide_.size();
+        std::copy_n(own >= 0 ? wide_.data() + own : text.utf16(), text.size(), end);
         wide_.setSize(wide_.size() + text.size());
     }
     return true;
@@ -158,11 +153,27 @@ bool ReportText::appendLineEnd()
     return true;
 }
 
+void ReportText::truncate(qint64 size)
+{
+    settle();
+    if (isNarrow_) {
+        narrow_.data(); // in one piece
+        narrow_.setSize(size);
+    } else {
+        wide_.data();
+        wide_.setSize(size);
+    }
+}
+
 bool ReportText::assign(QStringView text)
 {
-    const QString copy = text.toString(); // it may be a piece of this very text
+    if (owns(text)) {
+        const qint64 begin = text.utf16() - wide_.data();
+        truncate(begin + text.size());
+        return replaceNow(0, begin, {});
+    }
     drain();
-    return append(copy);
+    return append(text);
 }
 
 bool ReportText::replace(qint64 at, qint64 removed, QStringView inserted)
@@ -171,18 +182,13 @@ bool ReportText::replace(qint64 at, qint64 removed, QStringView inserted)
         return false;
     }
     if (owns(inserted)) {
-        return replace(at, removed, inserted.toString());
+        const QString copy = whileMemoryLasts(QString(), [inserted] { return inserted.toString(); });
+        return copy.size() == inserted.size() && replace(at, removed, copy);
     }
     if (isNarrow_ && !isLatin1(inserted) && !widen()) {
         return false;
     }
-    // The room is got now: carrying the edits out later cannot fail.
-    const qint64 kept = size() - pending_.growth();
-    if (inserted.size() <= longestPending && reserve(kept + pending_.inserted() + inserted.size())) {
-        pending_.replace(at, removed, inserted);
-        if (pending_.edits().size() > mostPending) {
-            settle();
-        }
+    if (replaceLater(at, removed, inserted)) {
         return true;
     }
     settle();
@@ -196,37 +202,33 @@ QString ReportText::piece(qint64 at, qint64 length) const
         return copy;
     }
     copy.reserve(length);
-    const qint64 end = at + length;
-    const auto addKept = [&](qint64 from, qint64 to) {
-        if (isNarrow_) {
-            copy += QLatin1StringView(reinterpret_cast<const char *>(narrow_.data()) + from, to - from);
-        } else {
-            copy += QStringView(wide_.data() + from, to - from);
-        }
-    };
-    // The text is what is kept, up to each edit that has not been carried out, and what that edit has inserted.
-    qint64 kept = 0;
-    qint64 place = 0;
-    const auto addPart = [&](qint64 partLength, auto add) {
-        const qint64 from = std::max(at, place);
-        const qint64 to = std::min(end, place + partLength);
+    qint64 begin = 0;
+    forEachPiece([&](auto part) {
+        const qint64 from = std::max(at, begin);
+        const qint64 to = std::min(at + length, begin + part.size());
         if (from < to) {
-            add(from - place, to - place);
+            copy += part.sliced(from - begin, to - from);
         }
-        place += partLength;
-    };
-    const auto addKeptUpTo = [&](qint64 stop) {
-        addPart(stop - kept, [&](qint64 from, qint64 to) { addKept(kept + from, kept + to); });
-        kept = stop;
-    };
-    for (const PendingEdits::Edit &edit : pending_.edits()) {
-        addKeptUpTo(edit.at);
-        addPart(edit.inserted.size(),
-                [&](qint64 from, qint64 to) { copy += QStringView(edit.inserted).sliced(from, to - from); });
-        kept = edit.at + edit.removed;
-    }
-    addKeptUpTo(size() - pending_.growth());
+        begin += part.size();
+    });
     return copy;
+}
+
+/// Keeps a replacement among those that are carried out when the text is next read. @return false, changing nothing, when
+/// it is too long for that or there is no memory
+bool ReportText::replaceLater(qint64 at, qint64 removed, QStringView inserted)
+{
+    // The room is got now: carrying the edits out later cannot fail.
+    const qint64 kept = size() - pending_.growth();
+    if (inserted.size() > longestPending || !reserve(kept + pending_.inserted() + inserted.size()) ||
+        !doneWhileMemoryLasts([&] { pending_.replace(at, removed, inserted); }))
+    {
+        return false;
+    }
+    if (pending_.edits().size() > mostPending) {
+        settle();
+    }
+    return true;
 }
 
 void ReportText::drain()

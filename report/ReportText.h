@@ -28,8 +28,8 @@ public:
     /// One block, empty. @throws std::bad_alloc when there is no memory for it
     explicit ReportText(Reallocate reallocate = nullptr);
 
-    /// The characters in UTF-16, with a 0 behind the last; valid until the next change. A text that cannot be had in
-    /// UTF-16 for want of memory shows as an empty one; `size` still says its length.
+    /// The characters in UTF-16, with a 0 after the last; valid until the next change. A text that cannot be had in
+    /// UTF-16 because memory has ended shows as an empty one; `size` still says its length.
     const char16_t *data() const;
     qint64 size() const { return (isNarrow_ ? narrow_.size() : wide_.size()) + pending_.growth(); }
     bool isEmpty() const { return size() == 0; }
@@ -40,11 +40,18 @@ public:
     bool isNarrow() const { return isNarrow_; }
     QLatin1StringView narrowView() const;
 
-    /// Whether a text is a piece of this very text, which a change may move.
+    /// Hands the text on in pieces, in their order, as it is kept: nothing is moved, no edit carried out and no memory
+    /// asked for.
+    /// @param take  is given a `QLatin1StringView` or a `QStringView`, never empty
+    template <typename Take>
+    void forEachPiece(Take take) const;
+
+    /// Whether a text is a piece of this very text, which a change may move. Such a piece, valid as long as the text is not
+    /// changed, can be appended, assigned and inserted like any other text.
     bool owns(QStringView text) const;
     bool owns(QLatin1StringView text) const;
 
-    /// Makes room for so many characters and the 0 behind them. @return false when there is no memory for them or they
+    /// Makes room for so many characters and the 0 after them. @return false when there is no memory for them or they
     /// are more than `longest`; the text stays as it is
     bool reserve(qint64 characters) { return isNarrow_ ? narrow_.reserve(characters) : wide_.reserve(characters); }
 
@@ -53,6 +60,8 @@ public:
     bool append(QLatin1StringView text);
     /// Appends a line end, CR LF. @return false, changing nothing, when there is no room
     bool appendLineEnd();
+    /// Takes what was written last off the end, down to a size.
+    void truncate(qint64 size);
     /// Replaces the text. @return false when there is no room; the text is then empty
     bool assign(QStringView text);
     /// Replaces a piece of the text. An edit costs what is typed, wherever it is: the edits are carried out in the long
@@ -79,6 +88,9 @@ private:
     }
     void carryOutPending() const;
     bool replaceNow(qint64 at, qint64 removed, QStringView inserted) const;
+    bool replaceLater(qint64 at, qint64 removed, QStringView inserted);
+    template <typename Take>
+    void forEachKeptPiece(qint64 begin, qint64 end, Take take) const;
 
     // How the text is kept is nothing that a reader sees, so it changes in a const text as well.
     mutable CharacterBlocks<unsigned char> narrow_;
@@ -86,5 +98,32 @@ private:
     mutable bool isNarrow_ = true;
     mutable PendingEdits pending_;
 };
+
+template <typename Take>
+void ReportText::forEachKeptPiece(qint64 begin, qint64 end, Take take) const
+{
+    if (isNarrow_) {
+        narrow_.forEachPiece(begin, end, [&take](const unsigned char *characters, qint64 count) {
+            take(QLatin1StringView(reinterpret_cast<const char *>(characters), count));
+        });
+    } else {
+        wide_.forEachPiece(begin, end,
+                           [&take](const char16_t *characters, qint64 count) { take(QStringView(characters, count)); });
+    }
+}
+
+template <typename Take>
+void ReportText::forEachPiece(Take take) const
+{
+    qint64 kept = 0;
+    for (const PendingEdits::Edit &edit : pending_.edits()) {
+        forEachKeptPiece(kept, edit.at, take);
+        if (!edit.inserted.isEmpty()) {
+            take(QStringView(edit.inserted));
+        }
+        kept = edit.at + edit.removed;
+    }
+    forEachKeptPiece(kept, size() - pending_.growth(), take);
+}
 
 } // namespace kareport

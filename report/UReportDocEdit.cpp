@@ -1,5 +1,7 @@
 #include "UReportDoc.h"
 
+#include "MemoryLasts.h"
+
 #include <algorithm>
 
 bool UReportDoc::ReplaceText(qint64 at, qint64 removed, QStringView inserted)
@@ -35,5 +37,10 @@ QString UReportDoc::CopyText(qint64 at, qint64 count) const
 QString UReportDoc::CopyText() const
 {
     const kareport::ReportText &text = page_.text();
-    return text.isNarrow() ? text.narrowView().toString() : text.view().toString();
+    return kareport::whileMemoryLasts(QString(), [&text] {
+        QString copy;
+        copy.reserve(text.size());
+        text.forEachPiece([&copy](auto piece) { copy += piece; });
+        return copy;
+    });
 }

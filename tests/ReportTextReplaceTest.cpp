@@ -6,6 +6,7 @@
 #include <gtest/gtest.h>
 
 #include <random>
+#include <utility>
 
 namespace
 {
@@ -222,6 +223,74 @@ TEST(ReportTextReplace, WithoutMemoryForUtf16AWiderCharacterIsRefused)
     EXPECT_TRUE(text.isNarrow());
     EXPECT_EQ(contentOf(text), u'y' + QString(19999, u'x'));
     EXPECT_EQ(memory.largest, LimitedMemory::bytesFor(32000)) << "there was no more to be had";
+}
+
+TEST(ReportTextReplace, GrowingKeepsWhatStandsAfterAnEdit)
+{
+    struct Row
+    {
+        qsizetype size;
+        qint64 at;
+        qint64 removed;
+        QString inserted;
+        const char *reason;
+    };
+    const Row rows[] = {
+        {31990, 5, 1, QStringLiteral("XY"), "near the start: nearly all of the text stands after it"},
+        {31990, 0, 0, QStringLiteral("X"), "before the first character"},
+        {31990, 31989, 1, QString(), "the last character goes"},
+        {31990, 100, 20000, QString(), "most of the text goes"},
+        {63990, 32000, 1, QStringLiteral("XY"), "where a block ends"},
+        {31990, 5, 1, QString(70000, u'X'), "longer than what is kept to be carried out later"},
+    };
+    using Grow = bool (*)(ReportText &, QString &);
+    const std::pair<Grow, const char *> grows[] = {
+        {[](ReportText &text, QString &expected) {
+             expected += QString(100, u'w');
+             return text.append(QString(100, u'w'));
+         },
+         "a text is written"},
+        {[](ReportText &text, QString &expected) {
+             expected += QStringLiteral("0123456789\r\n");
+             return text.append(QLatin1StringView("0123456789")) && text.appendLineEnd();
+         },
+         "a line is written"},
+        {[](ReportText &text, QString &) { return text.reserve(text.size() + 32001); }, "room is made"},
+        {[](ReportText &text, QString &expected) {
+             expected.insert(3, QString(70000, u'i'));
+             return text.replace(3, 0, QString(70000, u'i'));
+         },
+         "a long text is inserted"},
+        {[](ReportText &text, QString &expected) {
+             expected.insert(3, QString(40000, u'i'));
+             return text.replace(3, 0, QString(40000, u'i'));
+         },
+         "a text is inserted and kept for later"},
+        {[](ReportText &text, QString &expected) {
+             expected += QString(100, u'w') + wide;
+             return text.append(QString(100, u'w') + wide);
+         },
+         "the text becomes one of two bytes a character"},
+    };
+    for (const Row &row : rows) {
+        for (const auto &[grow, how] : grows) {
+            for (const bool narrow : {true, false}) {
+                ReportText text;
+                QString expected(row.size, u' ');
+                for (qsizetype i = 0; i < row.size; ++i) {
+                    expected[i] = QChar(static_cast<char16_t>(1 + i % 250));
+                }
+                ASSERT_TRUE(text.append(expected));
+                if (!narrow) {
+                    ASSERT_NE(text.data(), nullptr); // in UTF-16 from now on
+                }
+                ASSERT_TRUE(text.replace(row.at, row.removed, row.inserted));
+                expected.replace(row.at, row.removed, row.inserted);
+                ASSERT_TRUE(grow(text, expected));
+                EXPECT_TRUE(contentOf(text) == expected) << row.reason << "; " << how << "; narrow " << narrow;
+            }
+        }
+    }
 }
 
 } // namespace

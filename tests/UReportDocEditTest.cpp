@@ -77,4 +77,34 @@ TEST(UReportDocEdit, CopyingDoesNotChangeWhatIsCopied)
     EXPECT_EQ(copy, withZero) << "a copy stays as it was";
 }
 
+TEST(UReportDocEdit, WhatIsWrittenAfterAnEditAndMakesTheTextGrowLeavesItWhole)
+{
+    const FixedSurroundings surroundings;
+    struct Row
+    {
+        void (*grow)(UReportDoc &report);
+        qsizetype written;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {[](UReportDoc &report) { EXPECT_TRUE(report.Write(QString(100, u'w'), 0)); }, 100, "a text"},
+        {[](UReportDoc &report) { report.LineFeed(10); }, 20, "line ends"},
+        {[](UReportDoc &report) { EXPECT_EQ(report.CheckSize(32001), 1); }, 0, "room for one character more"},
+        {[](UReportDoc &report) { EXPECT_EQ(report.CheckSize(320000), 1); }, 0, "room for ten blocks"},
+    };
+    for (const Row &row : rows) {
+        for (const qsizetype length : {2, 70000}) { // carried out when the text is read, and at once
+            UReportDoc report;
+            ASSERT_TRUE(report.Write(QString(31990, u'x'), 0));
+            ASSERT_TRUE(report.ReplaceText(5, 1, QString(length, u'Y')));
+            row.grow(report);
+            const QString text = report.CopyText();
+            EXPECT_EQ(text.size(), 31989 + length + row.written) << row.reason;
+            EXPECT_EQ(text.count(u'x'), 31989) << row.reason << ", after an edit of " << length;
+            EXPECT_EQ(text.count(u'Y'), length) << row.reason << ", after an edit of " << length;
+            EXPECT_FALSE(text.contains(QChar(0))) << row.reason << ", after an edit of " << length;
+        }
+    }
+}
+
 } // namespace

@@ -351,4 +351,35 @@ TEST(UReportViewEdit, AFileThatChangesWhileItIsShownStaysAsItWasRead)
     EXPECT_TRUE(contentOf(path).find("aone") != std::string::npos) << "and is saved as it is shown";
 }
 
+TEST(UReportViewEdit, ALongInsertionIsFollowedByOthers)
+{
+    ShownReport shown(reportLines(QStringLiteral("first\nlast\n")));
+    UReportView &view = shown.open();
+    ReportEdit &edit = view.GetEdit();
+    QString expected = QStringLiteral("first\nlast\n");
+    const auto insert = [&](int at, const QString &text) {
+        putCursor(edit, at);
+        paste(edit, text);
+        expected.insert(at, text);
+        EXPECT_TRUE(shown.report.GetTextLength() == reportLines(expected).size()) << "after " << text.size();
+    };
+    insert(3, QString(70000, u'x')); // longer than what waits to be carried out
+    for (int i = 0; i < 3; ++i) {
+        putCursor(edit, 2);
+        key(edit, Qt::Key_A);
+        expected.insert(2, u'a');
+    }
+    insert(5, QString(40000, u'y'));
+    insert(10, QString(70000, u'z'));
+    putCursor(edit, 1);
+    key(edit, Qt::Key_Return);
+    expected.insert(1, u'\n');
+    EXPECT_EQ(shown.report.CheckSize(400000), 1);
+    shown.report.WriteLine(QStringLiteral("written"), 0, 1, 0);
+    shown.report.UpdateAllViews(nullptr);
+    expected += QStringLiteral("written\n");
+    EXPECT_TRUE(shown.lines() == expected);
+    EXPECT_TRUE(edit.toPlainText() == expected);
+}
+
 } // namespace

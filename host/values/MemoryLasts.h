@@ -1,0 +1,31 @@
+#pragma once
+
+#include <new>
+
+namespace kareport
+{
+
+/// Does work that needs memory: the one place where a lack of it, which Qt and the standard library throw, becomes an
+/// answer. The work must leave what it changes usable wherever it ends.
+/// @return what the work answers, or `otherwise` when memory ends
+template <typename Answer, typename Work>
+Answer whileMemoryLasts(Answer otherwise, Work work)
+{
+    try {
+        return work();
+    } catch (const std::bad_alloc &) {
+        return otherwise;
+    }
+}
+
+/// The same for work without an answer. @return whether it was done
+template <typename Work>
+bool doneWhileMemoryLasts(Work work)
+{
+    return whileMemoryLasts(false, [&work] {
+        work();
+        return true;
+    });
+}
+
+} // namespace kareport
