@@ -1,5 +1,7 @@
 #include "ReportTextCodec.h"
 
+#include "MemoryLasts.h"
+
 #include <QChar>
 #include <QIODevice>
 
@@ -156,9 +158,13 @@ bool ReportTextWriter::writePieces(Text text, bool last)
         if (lineEnds_ == LineEnds::ReportFile) {
             writeBytes(reportFileMark, sizeof reportFileMark);
         }
-        bytes_.resize(ReportTextEncoder::bound(pieceSize));
+        // What cannot be turned into bytes is as good as not written.
+        hasFailed_ |= !doneWhileMemoryLasts([this] { bytes_.resize(ReportTextEncoder::bound(pieceSize)); });
     }
     isEmpty_ = isEmpty_ && text.isEmpty();
+    if (hasFailed_) {
+        return false;
+    }
     qsizetype at = 0;
     do {
         const qsizetype count = std::min(pieceSize, text.size() - at);

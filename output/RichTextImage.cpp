@@ -1,6 +1,9 @@
 #include "RichTextImage.h"
 
+#include "MemoryLasts.h"
+
 #include <cstddef>
+#include <utility>
 
 namespace kareport
 {
@@ -46,24 +49,34 @@ QString RichTextImage::fontTable(const QString &fontName, unsigned fontSize)
 
 void RichTextImage::setOn(bool on)
 {
+    if (on) {
+        const QString key = QStringLiteral("<<%1>>").arg(placeholder);
+        std::array<ParagraphTemplate, 4> made; // all of them or none
+        for (std::size_t style = 0; style < made.size(); ++style) {
+            QString paragraph = sources[style];
+            cutToParagraph(paragraph);
+            const qsizetype at = paragraph.indexOf(key);
+            made[style] = {paragraph.first(at), paragraph.sliced(at + key.size())};
+        }
+        templates_ = std::move(made);
+    }
     on_ = on;
-    if (!on) {
-        return;
-    }
-    const QString key = QStringLiteral("<<%1>>").arg(placeholder);
-    for (std::size_t style = 0; style < templates_.size(); ++style) {
-        QString paragraph = sources[style];
-        cutToParagraph(paragraph);
-        const qsizetype at = paragraph.indexOf(key);
-        templates_[style] = {paragraph.first(at), paragraph.sliced(at + key.size())};
-    }
 }
 
-void RichTextImage::write(QStringView text, int style, Form form)
+bool RichTextImage::write(QStringView text, int style, Form form)
 {
-    if (!on_) {
-        return;
+    const qsizetype before = pieces_.size();
+    if (!on_ || doneWhileMemoryLasts([&] { add(text, style, form); })) {
+        return true;
     }
+    if (pieces_.size() != before) {
+        pieces_.truncate(before); // half of a paragraph would spoil all others
+    }
+    return false;
+}
+
+void RichTextImage::add(QStringView text, int style, Form form)
+{
     if (form == Form::BareText) {
         pieces_ += text;
         return;

@@ -31,12 +31,14 @@ public:
     static QString fontTable(const QString &fontName, unsigned fontSize);
 
     /// Switching on makes the templates. What has been written stays in either case.
+    /// @throws std::bad_alloc, with everything as it was
     void setOn(bool on);
     bool isOn() const { return on_; }
 
     /// Adds a piece of text in a style: 0 plain, 1 bold, 2 underlined, 3 both; other styles add nothing as rich text. An
     /// empty text is a line end. Nothing happens while the image is off.
-    void write(QStringView text, int style, Form form);
+    /// @return false, with nothing added, when there is no memory
+    bool write(QStringView text, int style, Form form);
     /// Empties the image. The templates stay.
     void clear() { pieces_.clear(); }
 
@@ -49,6 +51,8 @@ private:
         QString before; ///< what stands before the text
         QString behind;
     };
+
+    void add(QStringView text, int style, Form form);
 
     bool on_ = false;
     std::array<ParagraphTemplate, 4> templates_; ///< by style

@@ -48,7 +48,9 @@ void DataWriter::writeBlock(const UXmlReportBlock &block, const UDataObject &obj
         const std::size_t start = row_.size();
         formatter.append(row_, options_, entry->GetKind(), entry->GetData(), QStringView());
         row_.trim(start);
-        page_.writeLine(row_.view(), 0, 1, 0);
+        if (!page_.losesNothing([this] { page_.writeLine(row_.view(), 0, 1, 0); })) {
+            break;
+        }
     }
     endOutput(linesAfter);
 }
@@ -57,7 +59,10 @@ void DataWriter::writeTable(const UXmlReportTable &table, UDataObjectList &list,
 {
     page_.skipLines(layout.linesBefore);
     std::vector<quint32> sortIds;
-    table.GetSortList(sortIds);
+    if (!table.GetSortList(sortIds)) {
+        page_.noteLostText();
+        return;
+    }
     if (!sortIds.empty()) {
         list.Sort(sortIds);
     }
@@ -93,8 +98,10 @@ void DataWriter::placeHeading(const UXmlReportTable &table, bool writeName)
 void DataWriter::writeRows(const UXmlReportTable &table, UDataObjectList &list)
 {
     const std::vector<FieldFormatter> fields = formattersOf(table);
+    const quint64 losses = page_.losses();
     const UDataObject *object = list.GetAt(0);
-    for (std::size_t index = 1; object != nullptr; ++index) {
+    // With a row missing, those after it are of no use either.
+    for (std::size_t index = 1; object != nullptr && page_.losses() == losses; ++index) {
         // The row is complete before the next object is asked for: a list may hold one object at a time.
         formatRow(fields, *object);
         object = list.GetAt(index);

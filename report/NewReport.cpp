@@ -1,5 +1,6 @@
 #include "NewReport.h"
 
+#include "MemoryLasts.h"
 #include "ReportEntry.h"
 #include "UReportDoc.h"
 
@@ -8,19 +9,23 @@ namespace kareport
 
 UReportDoc *openNewReport(const NewReport &report, bool show, CViewPane *pane, unsigned style, const QRect *rect)
 {
-    UDocTemplate *reportTemplate = GetReportTemplate();
-    if (reportTemplate == nullptr) {
-        return nullptr;
-    }
     const int shown = show ? 1 : 0;
-    auto *made =
-        dynamic_cast<UReportDoc *>(reportTemplate->OpenReportDocumentFile(QString(), shown, shown, pane, style, rect));
+    auto *made = whileMemoryLasts<UReportDoc *>(nullptr, [&]() -> UReportDoc * {
+        UDocTemplate *reportTemplate = GetReportTemplate();
+        return reportTemplate == nullptr ? nullptr
+                                         : dynamic_cast<UReportDoc *>(reportTemplate->OpenReportDocumentFile(
+                                               QString(), shown, shown, pane, style, rect));
+    });
     if (made == nullptr) {
         return nullptr;
     }
     if (!report.name.isNull()) {
         made->SetTitle(report.name);
         made->SetReportFileName(report.name);
+    }
+    if (made->HasLostText()) {
+        made->OnCloseDocument(); // its title or its page header could not be made
+        return nullptr;
     }
     made->SetHeaderFlag(report.headerFlag);
     made->SetExternalEditorFlag(report.externalEditor);

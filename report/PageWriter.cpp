@@ -2,7 +2,6 @@
 
 #include <QByteArrayView>
 
-#include <new>
 #include <type_traits>
 
 namespace kareport
@@ -43,7 +42,7 @@ void PageWriter::clear()
 {
     text_.clear();
     starts_.clear();
-    hasLostText_ = false;
+    losses_ = 0;
     lineCount_ = 0;
     heading_.text.clear();
     noteChange();
@@ -58,25 +57,42 @@ bool PageWriter::emptyIntoOutlet()
 }
 
 template <typename View>
+bool PageWriter::tellWritten(View text, int style)
+{
+    if constexpr (std::is_same_v<View, QStringView>) {
+        return observer_->textWritten(text, style);
+    } else {
+        return whileMemoryLasts(false, [&] { return observer_->textWritten(QString(text), style); });
+    }
+}
+
+template <typename View>
 bool PageWriter::writeText(View text, int style)
 {
-    if (text_.owns(text)) {
-        return writeText(QStringView(text.toString()), style);
-    }
+    const bool isOwn = text_.owns(text);
+    const qint64 before = text_.size();
+    const int lineFeeds = countLineFeeds(text);
     if (!text_.append(text)) {
-        hasLostText_ = true;
+        noteLostText();
         return false;
     }
-    const int lineFeeds = countLineFeeds(text);
+    if (isOwn) { // the text may have moved, and the piece with it
+        if constexpr (std::is_same_v<View, QStringView>) {
+            text = text_.view().sliced(before);
+        } else {
+            text = text_.narrowView().sliced(before);
+        }
+    }
     lineNumber_ += lineFeeds;
     lineCount_ += lineFeeds;
     if (observer_ != nullptr && !text.isEmpty()) {
         if (!observer_->takesText()) {
             observer_->changed();
-        } else if constexpr (std::is_same_v<View, QStringView>) {
-            observer_->textWritten(text, style);
-        } else {
-            observer_->textWritten(QString(text), style);
+        } else if (!tellWritten(text, style)) {
+            lineNumber_ -= lineFeeds;
+            lineCount_ -= lineFeeds;
+            takeBack(before);
+            return false;
         }
     }
     noteGrowth();
@@ -97,11 +113,12 @@ void PageWriter::lineFeed(qint64 count)
 {
     for (qint64 i = 0; i < count; ++i) {
         if (!text_.appendLineEnd()) {
-            hasLostText_ = true;
+            noteLostText();
             return;
         }
-        if (observer_ != nullptr) {
-            observer_->lineEnded();
+        if (observer_ != nullptr && !observer_->lineEnded()) {
+            takeBack(text_.size() - 2);
+            return;
         }
         ++lineNumber_;
         ++lineCount_;
@@ -111,10 +128,10 @@ void PageWriter::lineFeed(qint64 count)
 
 bool PageWriter::replace(qint64 at, qint64 removed, QStringView inserted)
 {
-    if (text_.owns(inserted)) {
-        return replace(at, removed, inserted.toString());
-    }
-    try {
+    return whileMemoryLasts(false, [&] {
+        if (text_.owns(inserted)) {
+            return replace(at, removed, inserted.toString());
+        }
         const bool wantsRemoved = starts_.wantsRemoved(at, removed, inserted.size());
         const QString removedText = wantsRemoved ? text_.piece(at, removed) : QString();
         PageStarts::Edit edit = starts_.prepare(at, removed, removedText, inserted);
@@ -122,21 +139,14 @@ bool PageWriter::replace(qint64 at, qint64 removed, QStringView inserted)
             return false;
         }
         starts_.carryOut(std::move(edit));
-    } catch (const std::bad_alloc &) {
-        return false;
-    }
-    return true;
+        return true;
+    });
 }
 
 void PageWriter::notePageStart()
 {
-    if (outlet_ != nullptr) {
-        return;
-    }
-    try {
-        starts_.add(text_.size());
-    } catch (const std::bad_alloc &) {
-        hasLostText_ = true; // the text is whole, its pages are not
+    if (outlet_ == nullptr && !doneWhileMemoryLasts([this] { starts_.add(text_.size()); })) {
+        noteLostText(); // the text is whole, its pages are not
     }
 }
 

@@ -1,5 +1,6 @@
 #include "ReportEntry.h"
 
+#include "MemoryLasts.h"
 #include "NewReport.h"
 #include "ReportViewPort.h"
 #include "ReportWindow.h"
@@ -43,6 +44,8 @@ UDocTemplate *GetReportTemplate()
 UReportDoc *CreateReport(const QString &name, bool headerFlag, bool externalEditor, CViewPane *pane, unsigned style,
                          const QRect *rect)
 {
-    return kareport::openNewReport({name, headerFlag, externalEditor}, !IsUseExternalEditor(externalEditor), pane,
-                                   style, rect);
+    return kareport::whileMemoryLasts<UReportDoc *>(nullptr, [&] {
+        return kareport::openNewReport({name, headerFlag, externalEditor}, !IsUseExternalEditor(externalEditor), pane,
+                                       style, rect);
+    });
 }

@@ -2,6 +2,7 @@
 
 #include "ApplicationTitle.h"
 #include "Clock.h"
+#include "MemoryLasts.h"
 #include "PageHeader.h"
 #include "Preferences.h"
 #include "Profile.h"
@@ -19,6 +20,19 @@ namespace
 const QString marginsEntry = QStringLiteral("Report Margins");
 const QString printHashEntry = QStringLiteral("ReportPrintHash");
 
+/// Lets the module's printer stand as reports are printed, for a moment.
+class ReportOrientation
+{
+public:
+    ReportOrientation() { UPreviewDlg::SetModulePrinterOrientationPortrait(IsReportPrinterSetToPortrait()); }
+    ~ReportOrientation() { UPreviewDlg::SetModulePrinterOrientationPortrait(wasPortrait_); }
+    ReportOrientation(const ReportOrientation &) = delete;
+    ReportOrientation &operator=(const ReportOrientation &) = delete;
+
+private:
+    bool wasPortrait_ = UPreviewDlg::IsModulePrinterOrientationPortrait();
+};
+
 } // namespace
 
 QHash<const UReportDoc *, bool> UReportDoc::UReportMgr;
@@ -35,12 +49,12 @@ UReportDoc::UReportDoc(const QString &name, bool externalEditor, bool closeDocum
     }
     SetHeader();
     LoadSettings();
-    UReportMgr.insert(this, true);
     const QString printHash = GetProfileString(QString(), printHashEntry).trimmed();
     if (!printHash.isEmpty()) {
         printHash_ = kareport::leadingInteger(printHash) != 0;
     }
     chainageLabel_ = Xlate("Station");
+    UReportMgr.insert(this, true); // nothing after it can fail: what is entered is alive
 }
 
 UReportDoc::~UReportDoc()
@@ -89,12 +103,14 @@ void UReportDoc::LineFeed(int count)
 
 bool UReportDoc::NewPage(int linesNeeded)
 {
-    return page_.newPage(linesNeeded);
+    bool isNew = true; // also a page whose header there is no memory for
+    page_.losesNothing([&] { isNew = page_.newPage(linesNeeded); });
+    return isNew;
 }
 
 void UReportDoc::WriteLine(const QString &text, int linesBefore, int linesAfter, int style)
 {
-    page_.writeLine(text, linesBefore, linesAfter, style);
+    page_.losesNothing([&] { page_.writeLine(text, linesBefore, linesAfter, style); });
 }
 
 void UReportDoc::SetHeading(const QString &heading, int linesBefore, int linesAfter)
@@ -109,28 +125,40 @@ void UReportDoc::WriteHeading()
 
 void UReportDoc::SetHeader()
 {
-    page_.setHeaderLine(kareport::pageHeaderLine(GetApplicationTitle(), title_, kareport::currentTime(),
-                                                 Xlate("   Page:@@Report Header"), geometry_.charsPerRow));
+    page_.losesNothing([this] {
+        page_.setHeaderLine(kareport::pageHeaderLine(GetApplicationTitle(), title_, kareport::currentTime(),
+                                                     Xlate("   Page:@@Report Header"), geometry_.charsPerRow));
+    });
 }
 
 void UReportDoc::WriteHeader()
 {
-    page_.writeHeader();
+    page_.losesNothing([this] { page_.writeHeader(); });
 }
 
-void UReportDoc::textWritten(QStringView text, int style)
+bool UReportDoc::textWritten(QStringView text, int style)
 {
-    SetModifiedFlag(true);
-    image_.write(text, style, imageForm());
-    if (reportWindow_ != nullptr) {
-        reportWindow_->WriteLine(text.toString());
+    const bool isTaken = kareport::whileMemoryLasts(false, [&] {
+        // The window takes back nothing, so what may fail comes before it.
+        const QString piece = reportWindow_ != nullptr ? text.toString() : QString();
+        if (!image_.write(text, style, imageForm())) {
+            return false;
+        }
+        if (reportWindow_ != nullptr) {
+            reportWindow_->WriteLine(piece);
+        }
+        return true;
+    });
+    if (isTaken) {
+        SetModifiedFlag(true);
     }
+    return isTaken;
 }
 
-void UReportDoc::lineEnded()
+bool UReportDoc::lineEnded()
 {
     SetModifiedFlag(true);
-    image_.write({}, 0, imageForm());
+    return image_.write({}, 0, imageForm());
 }
 
 void UReportDoc::changed()
@@ -140,19 +168,24 @@ void UReportDoc::changed()
 
 int UReportDoc::SetPageSize()
 {
-    const bool wasPortrait = UPreviewDlg::IsModulePrinterOrientationPortrait();
-    UPreviewDlg::SetModulePrinterOrientationPortrait(IsReportPrinterSetToPortrait());
+    return kareport::whileMemoryLasts(0, [this] { return measurePage(); });
+}
+
+int UReportDoc::measurePage()
+{
+    const ReportOrientation orientation;
     const auto device = kareport::defaultPageDevice(UPreviewDlg::IsModulePrinterOrientationPortrait());
-    UPreviewDlg::SetModulePrinterOrientationPortrait(wasPortrait);
     if (!device) {
         return 0;
     }
-    geometry_.pageSize = device->size;
-    geometry_.resolution = static_cast<unsigned>(device->resolution);
+    kareport::PageGeometry measured = geometry_;
+    measured.pageSize = device->size;
+    measured.resolution = static_cast<unsigned>(device->resolution);
     if (!IsPageFixed() || !fixedCharsPerRow_) {
-        geometry_ =
+        measured =
             kareport::measurePage(*device, margins_, kareport::measureFont(fontName_, fontSize_, device->resolution));
     }
+    geometry_ = measured;
     applyGivenPage();
     return 1;
 }
@@ -181,16 +214,20 @@ void UReportDoc::applyGivenPage()
 
 void UReportDoc::LoadSettings()
 {
-    const QString margins = GetProfileString(QString(), marginsEntry);
-    if (margins.isEmpty()) {
-        SaveSettings();
-    } else {
-        margins_ = kareport::marginsFromText(margins, margins_);
-    }
-    fontSize_ = GetReportFontSize();
+    // Without memory the settings stay as they are.
+    kareport::doneWhileMemoryLasts([this] {
+        const QString margins = GetProfileString(QString(), marginsEntry);
+        if (margins.isEmpty()) {
+            SaveSettings();
+        } else {
+            margins_ = kareport::marginsFromText(margins, margins_);
+        }
+        fontSize_ = GetReportFontSize();
+    });
 }
 
 void UReportDoc::SaveSettings()
 {
-    WriteProfileString(QString(), marginsEntry, kareport::marginsToText(margins_));
+    kareport::doneWhileMemoryLasts(
+        [this] { WriteProfileString(QString(), marginsEntry, kareport::marginsToText(margins_)); });
 }

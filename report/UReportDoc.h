@@ -58,8 +58,8 @@ public:
     /// The same with its length, for texts that hold a character 0.
     QStringView GetText() const { return page_.text().view(); }
     bool IsEmpty() const { return page_.text().isEmpty(); }
-    /// Whether a part of what was to be written since the last `Clear` is missing, for want of memory. Such a report is not
-    /// saved.
+    /// Whether a part of what was to be written, or set, since the last `Clear` is missing because memory has ended. Such a
+    /// report is not saved, also when nothing is left of it.
     bool HasLostText() const { return page_.hasLostText(); }
     /// Writes the text to an open device, in UTF-8. @return false as soon as a write fails
     bool WriteText(QIODevice &device, kareport::LineEnds lineEnds) const;
@@ -75,7 +75,7 @@ public:
     bool WritePdf(QIODevice &device, kareport::PdfNotes *notes = nullptr,
                   const std::function<bool(qint64, qint64)> &progress = {}) const;
     /// Replaces the text as it is. Counters stay, so what is written next continues the old pages. Where its pages begin is
-    /// found by its page headers.
+    /// found by its page headers. Without memory for it the text is empty, and lost.
     void SetData(const QString &text);
     /// Replaces a piece of the text as it is, in a time that does not grow with the text. Counters stay; pages begin where
     /// they did before.
@@ -87,8 +87,10 @@ public:
     /// How often a text took the place of another, in whole or in part. What is only written at the end does not count: it
     /// changes the length.
     quint64 GetEditCount() const { return editCount_; }
+    /// Empty when there is no memory for it.
     QString CopyText() const;
     /// A copy of a piece of the text: of as many characters of it as there are. @param at  the first character, from 0
+    /// @return empty when there is no memory for it
     QString CopyText(qint64 at, qint64 count) const;
     /// Empties the report. The next line written begins page 1.
     virtual void Clear();
@@ -119,21 +121,24 @@ public:
 
     // --- Rich text --------------------------------------------------------------------------------------------------
 
-    /// Switches rich-text mode: while it is on, what is written goes into a rich-text image as well.
-    void SetRTFDataFlag(bool on) { image_.setOn(on); }
+    /// Switches rich-text mode: while it is on, what is written goes into a rich-text image as well. Without memory for it the
+    /// mode stays off, and the report has lost text.
+    void SetRTFDataFlag(bool on);
     bool GetRTFDataFlag() const { return image_.isOn(); }
-    /// Cuts a rich-text document down to its paragraph. @return false, with the text as it was, when it has none
-    static bool ResetFormatString(QString &document) { return kareport::RichTextImage::cutToParagraph(document); }
+    /// Cuts a rich-text document down to its paragraph. @return false, with the text as it was, when it has none or memory
+    /// ends
+    static bool ResetFormatString(QString &document);
     /// Adds a piece of text in a style to the image, or a line end for an empty text; nothing while rich-text mode is off.
     void WriteRTFData(const QString &text, int style);
-    /// The whole rich-text document; in external-Excel mode only the texts that were written.
+    /// The whole rich-text document; in external-Excel mode only the texts that were written. Empty when there is no memory
+    /// for it.
     void GetRTFData(QString &document) const;
     /// The font table of the document.
     void GetFontTableData(QString &table) const;
-    /// Writes the font table to an open device. @return false when the write fails
+    /// Writes the font table to an open device. @return false when the write fails or memory ends
     bool WriteFontTable(QIODevice &device) const;
     /// Writes the rich-text document for a word processor to an open device, one byte a character.
-    /// @return false as soon as a write fails
+    /// @return false as soon as a write fails, when memory ends or when the report has lost text
     bool WriteRichTextFile(QIODevice &device) const;
 
     // --- Page -------------------------------------------------------------------------------------------------------
@@ -196,7 +201,7 @@ public:
     bool LoadTemplateXml(const QString &fileName, const QString &templateName, const QString &tableName,
                          const QString &blockName);
     /// Loads a table, or a block, of the loaded template in the place of the one before, which is gone also when this
-    /// fails. @return false without a template, or when it has no such table or block or not its dictionary
+    /// fails. @return false without a template, when it has no such table or block or not its dictionary, or without memory
     bool LoadTemplateTable(const QString &tableName);
     bool LoadTemplateBlock(const QString &blockName);
     /// The loaded template, or null.
@@ -209,13 +214,14 @@ public:
                                      const QString &offsetStyle) const;
 
     /// Writes an object through the loaded block: a line for each field that the object has a value for.
-    /// @return false, with nothing written, when no block is loaded or the object is null
+    /// @return false, with nothing written, when no block is loaded or the object is null; false as well when memory ends in
+    ///         the middle: what comes then is not written
     bool WriteDataBlock(const UDataObject *object, int linesBefore, int linesAfter);
     bool WriteDataBlock(const QString &blockName, const UDataObject *object, int linesBefore, int linesAfter);
     /// Writes a list through the loaded table: heading, then a line for each object, sorted if the table says so.
     /// @param headingLinesAfter  line ends behind the heading; -1 for 2
-    /// @return false, with nothing written, when no table is loaded or the list is null; false as well when memory runs
-    ///         out in the middle
+    /// @return false, with nothing written, when no table is loaded or the list is null; false as well when memory ends in
+    ///         the middle: what comes then is not written
     bool WriteDataTable(UDataObjectList *list, int linesBefore, int linesAfter, int headingLinesAfter);
     bool WriteDataTable(const QString &tableName, UDataObjectList *list, int linesBefore, int linesAfter,
                         int headingLinesAfter);
@@ -314,7 +320,7 @@ public:
     bool DoSave(const QString &path, bool replace) override;
     /// Writes the file in one step. The name's ending says what: ".rtf" the rich text of the report's view, ".pdf" a PDF,
     /// any other the report text. An empty report text is saved by doing nothing.
-    /// @return false when it could not be written: an earlier file is then as it was
+    /// @return false when it could not be written, or the report has lost text: an earlier file is then as it was
     bool OnSaveDocument(const QString &path) override;
     /// Why the last `OnSaveDocument` failed, as the end of a sentence; empty when it did not, or nothing is known.
     const QString &GetSaveProblem() const { return saveProblem_; }
@@ -325,9 +331,9 @@ public:
     void Serialize(UArchive &archive) override;
     /// Reads a report file, or a rich-text file, at the end of what the report holds.
     /// @param keepLineEnds  whether the lines keep their own line ends before the one that each of them gets
-    /// @return 0 for an empty path or a file that cannot be opened, else 1
+    /// @return 0 for an empty path, a file that cannot be opened or one that there is no memory for, else 1
     int LoadFile(const QString &path, bool keepLineEnds);
-    /// A temporary name for the report that no report has had.
+    /// A temporary name for the report that no report has had; empty when memory ends.
     QString GetCurrentReportFileName() const;
     /// Gives the text that the user edited in the view back to the object that the report was made from.
     void SaveText();
@@ -359,19 +365,33 @@ private:
     };
 
     bool takesText() const override { return image_.isOn() || reportWindow_ != nullptr; }
-    void textWritten(QStringView text, int style) override;
-    void lineEnded() override;
+    bool textWritten(QStringView text, int style) override;
+    bool lineEnded() override;
     void changed() override;
 
     kareport::FormatOptions formatOptions() const;
     kareport::RichTextImage::Form imageForm() const;
     void applyGivenPage();
+    int measurePage();
+    bool loadTemplate(const QString &fileName, const QString &templateName, const QString &tableName,
+                      const QString &blockName);
+    template <typename Work>
+    bool writeData(Work write);
     bool saveByName(const QString &path);
+    bool saveUnderChosenName(const QString &path, bool replace);
+    void readLines(QIODevice &file, bool mayBeRichText, bool keepLineEnds);
+    void sendText();
+    bool writeAsPdf(QIODevice &device, kareport::PdfNotes *notes,
+                    const std::function<bool(qint64, qint64)> &progress) const;
     bool saveText(const QString &path);
     std::optional<bool> saveViewAsRichText(const QString &path);
     /// Opens a file that was saved in the user's preferred editor, if the report is marked for it.
     void openSavedFile(const QString &path);
+    /// The editor that the report goes to; empty when it goes to none.
+    QString editorForReport() const;
     void openInEditor(const QString &editor);
+    void openWrittenInEditor(const QString &editor);
+    void convertForEditor();
     /// Saves under a temporary name, or under the next one that is free, in a file that only the user can read.
     /// @return the name; empty when no name is free
     QString saveForEditor(QString name);

@@ -16,22 +16,12 @@ bool UReportDoc::ReplaceText(qint64 at, qint64 removed, QStringView inserted)
     return true;
 }
 
-namespace
-{
-
-template <typename View>
-QString piece(View text, qint64 at, qint64 count)
-{
-    const qint64 first = std::clamp<qint64>(at, 0, text.size());
-    return text.sliced(first, std::clamp<qint64>(count, 0, text.size() - first)).toString();
-}
-
-} // namespace
-
 QString UReportDoc::CopyText(qint64 at, qint64 count) const
 {
     const kareport::ReportText &text = page_.text();
-    return text.isNarrow() ? piece(text.narrowView(), at, count) : piece(text.view(), at, count);
+    const qint64 first = std::clamp<qint64>(at, 0, text.size());
+    return kareport::whileMemoryLasts(
+        QString(), [&] { return text.piece(first, std::clamp<qint64>(count, 0, text.size() - first)); });
 }
 
 QString UReportDoc::CopyText() const

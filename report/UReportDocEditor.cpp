@@ -6,6 +6,7 @@
 #include "EditorLauncher.h"
 #include "FileExtension.h"
 #include "Folders.h"
+#include "MemoryLasts.h"
 #include "Preferences.h"
 #include "PrivateFile.h"
 #include "Profile.h"
@@ -65,7 +66,7 @@ void forEachWrittenLine(View text, Take take)
 
 bool IsUseExternalEditor(bool want)
 {
-    return want && !availableEditor().isEmpty();
+    return want && kareport::whileMemoryLasts(false, [] { return !availableEditor().isEmpty(); });
 }
 
 bool UReportDoc::UsePreferredReportEditor() const
@@ -86,16 +87,24 @@ bool UReportDoc::IsConvertToOpenInWord(const QString &file, const QString &edito
 
 void UReportDoc::UpdateAllViews(UView *sender, long hint, void *hintObject)
 {
-    const QString editor = externalEditor_ ? availableEditor() : QString();
-    if (editor.isEmpty()) {
-        UDocument::UpdateAllViews(sender, hint, hintObject);
-        if (IsReportAvailable(this)) { // its last view may have closed it
-            showFrame();
+    kareport::doneWhileMemoryLasts([&] {
+        const QString editor = editorForReport();
+        if (editor.isEmpty()) {
+            UDocument::UpdateAllViews(sender, hint, hintObject);
+            if (IsReportAvailable(this)) { // its last view may have closed it
+                showFrame();
+            }
+        } else {
+            openInEditor(editor);
         }
-    } else {
-        openInEditor(editor);
-    }
-    CPropertyPane::UpdateAllPropertyPane(IsReportAvailable(this) ? this : nullptr);
+        CPropertyPane::UpdateAllPropertyPane(IsReportAvailable(this) ? this : nullptr);
+    });
+}
+
+QString UReportDoc::editorForReport() const
+{
+    // Half a report is shown here, where it is known for what it is; an editor would take it for a whole one.
+    return externalEditor_ && !HasLostText() ? availableEditor() : QString();
 }
 
 void UReportDoc::showFrame()
@@ -121,7 +130,8 @@ void UReportDoc::openInEditor(const QString &editor)
     }
     // While it is being loaded, whoever loads it still needs it. What the editor did not get, for want of room on the disk or
     // of memory, is nowhere else.
-    if (IsReportAvailable(this) && closeDocument_ && !isSerializing_ && (IsEmpty() || !IsModified())) {
+    if (IsReportAvailable(this) && closeDocument_ && !isSerializing_ && !HasLostText() && (IsEmpty() || !IsModified()))
+    {
         OnCloseDocument();
     }
 }
@@ -144,6 +154,11 @@ QString UReportDoc::saveForEditor(QString name)
 
 void UReportDoc::ConvertAndOpenInWord()
 {
+    kareport::doneWhileMemoryLasts([this] { convertForEditor(); });
+}
+
+void UReportDoc::convertForEditor()
+{
     UDocTemplate *reportTemplate = GetReportTemplate();
     if (reportTemplate == nullptr) {
         return;
@@ -160,7 +175,7 @@ void UReportDoc::ConvertAndOpenInWord()
     converted->SetRTFDataFlag(true);
     converted->SetReportFileName(reportFileName_);
     converted->exportOptions_ |= exportOptions_;
-    converted->writeLinesOf(page_.text());
+    converted->page_.losesNothing([&] { converted->writeLinesOf(page_.text()); });
     if (HasLostText()) {
         converted->page_.noteLostText();
     }
@@ -194,11 +209,18 @@ void UReportDoc::writeLinesOf(const kareport::ReportText &text)
 
 void UReportDoc::ReportRTfData()
 {
-    const QString editor = externalEditor_ ? availableEditor() : QString();
-    if (editor.isEmpty()) {
-        showInModule();
-        return;
-    }
+    kareport::doneWhileMemoryLasts([this] {
+        const QString editor = editorForReport();
+        if (editor.isEmpty()) {
+            showInModule();
+        } else {
+            openWrittenInEditor(editor);
+        }
+    });
+}
+
+void UReportDoc::openWrittenInEditor(const QString &editor)
+{
     const QString name = GetCurrentReportFileName();
     const bool takesRichText = kareport::editorKind(editor, IsOptionExcel()) == EditorKind::WordProcessor;
     const QString richText = takesRichText ? writeRichTextForEditor(name) : QString();
@@ -215,7 +237,7 @@ QString UReportDoc::writeRichTextForEditor(const QString &name) const
         }
         file.setFileName(stem + u'_' + QString::number(number) + QStringLiteral(".rtf"));
     }
-    if (HasLostText() || !WriteRichTextFile(file) || !file.flush()) {
+    if (!WriteRichTextFile(file) || !file.flush()) {
         file.remove();
         return QString();
     }

@@ -4,6 +4,7 @@
 #include "FileExtension.h"
 #include "Folders.h"
 #include "LineEndings.h"
+#include "MemoryLasts.h"
 #include "PdfExport.h"
 #include "ReplaceFile.h"
 #include "ReportContent.h"
@@ -37,6 +38,11 @@ bool isPdfName(const QString &name)
 
 bool UReportDoc::DoSave(const QString &path, bool replace)
 {
+    return kareport::whileMemoryLasts(false, [&] { return saveUnderChosenName(path, replace); });
+}
+
+bool UReportDoc::saveUnderChosenName(const QString &path, bool replace)
+{
     bool isSaved = false;
     QString name = path;
     if (path.isEmpty() || replace) {
@@ -65,16 +71,21 @@ bool UReportDoc::DoSave(const QString &path, bool replace)
 bool UReportDoc::OnSaveDocument(const QString &path)
 {
     saveProblem_.clear();
-    const bool isSaved = saveByName(path);
+    const bool isSaved = kareport::whileMemoryLasts(false, [&] { return saveByName(path); });
     if (isSaved) {
         saveProblem_.clear(); // a view that could not write left its reason to the next one
-        OnDocumentEvent(DocumentEvent::AfterSaveDocument);
+        kareport::doneWhileMemoryLasts([this] { OnDocumentEvent(DocumentEvent::AfterSaveDocument); });
     }
     return isSaved;
 }
 
 bool UReportDoc::saveByName(const QString &path)
 {
+    if (HasLostText()) {
+        // It would put half a report in the place of a whole one, or nothing in the place of what was lost.
+        saveProblem_ = Xlate("a part of the report was lost when memory ran out");
+        return false;
+    }
     if (isRichTextName(path)) {
         // Without a view that can write it, the report text is saved under the name.
         const auto saved = saveViewAsRichText(path);
@@ -116,7 +127,7 @@ std::optional<bool> UReportDoc::saveViewAsRichText(const QString &path)
             },
             &saveProblem_);
         if (saved) {
-            openSavedFile(path);
+            kareport::doneWhileMemoryLasts([&] { openSavedFile(path); });
         }
         if (isOpen) {
             return saved;
@@ -130,9 +141,6 @@ bool UReportDoc::saveText(const QString &path)
     // An empty report is saved by doing nothing: no file is made and none is emptied.
     const auto write = [this](QIODevice &device) { return WriteText(device, kareport::LineEnds::ReportFile); };
     if (!IsEmpty() && !kareport::replaceFile(path, write, &saveProblem_)) {
-        if (HasLostText()) {
-            saveProblem_ = Xlate("a part of the report was lost when memory ran out");
-        }
         return false;
     }
     SetModifiedFlag(false);
@@ -145,8 +153,10 @@ bool UReportDoc::WriteText(QIODevice &device, kareport::LineEnds lineEnds) const
         return false;
     }
     const kareport::ReportText &text = page_.text();
-    return text.isNarrow() ? kareport::writeReportText(device, text.narrowView(), lineEnds)
-                           : kareport::writeReportText(device, text.view(), lineEnds);
+    return kareport::whileMemoryLasts(false, [&] {
+        return text.isNarrow() ? kareport::writeReportText(device, text.narrowView(), lineEnds)
+                               : kareport::writeReportText(device, text.view(), lineEnds);
+    });
 }
 
 bool UReportDoc::EndTextStream(kareport::ReportTextWriter &writer)
@@ -160,9 +170,12 @@ bool UReportDoc::EndTextStream(kareport::ReportTextWriter &writer)
 bool UReportDoc::WritePdf(QIODevice &device, kareport::PdfNotes *notes,
                           const std::function<bool(qint64, qint64)> &progress) const
 {
-    if (HasLostText()) {
-        return false;
-    }
+    return !HasLostText() && kareport::whileMemoryLasts(false, [&] { return writeAsPdf(device, notes, progress); });
+}
+
+bool UReportDoc::writeAsPdf(QIODevice &device, kareport::PdfNotes *notes,
+                            const std::function<bool(qint64, qint64)> &progress) const
+{
     kareport::PdfOptions options;
     options.page = {geometry_.pageSize, geometry_.resolution, margins_, fontSize_, GetLinesPerPage()};
     options.lineCount = GetLineCount();
@@ -191,7 +204,8 @@ QString UReportDoc::GetCurrentReportFileName() const
 {
     // One for all reports, so that no two of them get one name.
     static kareport::TemporaryNames names;
-    return names.next(GetTempDir(false), kareport::temporaryStem(reportFileName_));
+    return kareport::whileMemoryLasts(
+        QString(), [this] { return names.next(GetTempDir(false), kareport::temporaryStem(reportFileName_)); });
 }
 
 void UReportDoc::SetTextObject(void *object, unsigned id)
@@ -202,9 +216,13 @@ void UReportDoc::SetTextObject(void *object, unsigned id)
 
 void UReportDoc::SaveText()
 {
-    if (textObjectId_ == 0 || textObject_ == nullptr) {
-        return;
+    if (textObjectId_ != 0 && textObject_ != nullptr) {
+        kareport::doneWhileMemoryLasts([this] { sendText(); });
     }
+}
+
+void UReportDoc::sendText()
+{
     QString edited;
     for (UView *view : kareport::reportViews(*this)) {
         QBuffer bytes;

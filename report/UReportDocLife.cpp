@@ -1,6 +1,7 @@
 #include "UReportDoc.h"
 
 #include "CViewPane.h"
+#include "MemoryLasts.h"
 #include "ReportViews.h"
 #include "ReportWindow.h"
 #include "TemplateText.h"
@@ -32,13 +33,15 @@ bool isTaken(const QString &title)
 
 void UReportDoc::SetTitle(const QString &title)
 {
-    const QString given = title; // may be the very title that is numbered below
-    title_ = given;
-    SetHeader();
-    for (int number = 2; isTaken(title_); ++number) {
-        title_ = given + u' ' + QString::number(number);
-    }
-    UDocument::SetTitle(title_);
+    page_.losesNothing([&] {
+        const QString given = title; // may be the very title that is numbered below
+        title_ = given;
+        SetHeader();
+        for (int number = 2; isTaken(title_); ++number) {
+            title_ = given + u' ' + QString::number(number);
+        }
+        UDocument::SetTitle(title_);
+    });
 }
 
 void UReportDoc::SetWindowTextW(const QString &text)
@@ -72,7 +75,7 @@ void UReportDoc::openOwnPane()
 
 void UReportDoc::Activate(bool /*reserved*/)
 {
-    openOwnPane();
+    kareport::doneWhileMemoryLasts([this] { openOwnPane(); });
     UpdateAllViews(nullptr, 0, nullptr);
 }
 

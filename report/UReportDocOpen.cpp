@@ -1,6 +1,7 @@
 #include "UReportDoc.h"
 
 #include "AppMessageBox.h"
+#include "MemoryLasts.h"
 #include "ReportFileReader.h"
 #include "RichTextReader.h"
 #include "StandardText.h"
@@ -35,7 +36,7 @@ bool holdsRichText(const QString &path)
 bool UReportDoc::OnOpenDocument(const QString &path)
 {
     openedFromRtf_ = namesRichText(path);
-    if (!UDocument::OnOpenDocument(path)) {
+    if (!kareport::whileMemoryLasts(false, [&] { return UDocument::OnOpenDocument(path); })) {
         return false;
     }
     SetPageSize();
@@ -48,6 +49,9 @@ void UReportDoc::Serialize(UArchive &archive)
         // As many bytes as the text has characters, which is the first half of it: what reads such archives counts on
         // that length.
         archive.Write(QByteArrayView(reinterpret_cast<const char *>(GetData()), GetText().size()));
+        if (GetText().size() != GetTextLength()) {
+            archive.Abandon(); // there is no memory for it in UTF-16
+        }
         return;
     }
     if (!GetViews().empty() && archive.GetLength() > UView::nMaxSize) {
@@ -74,14 +78,25 @@ int UReportDoc::LoadFile(const QString &path, bool keepLineEnds)
         return 0;
     }
     // Rich text is opened as a document; its source is what is loaded then.
-    if (!isSerializing_ && namesRichText(path) && holdsRichText(path)) {
+    const bool isDocument = kareport::whileMemoryLasts(
+        false, [&] { return !isSerializing_ && namesRichText(path) && holdsRichText(path); });
+    if (isDocument) {
         OnOpenDocument(path);
         return 1;
     }
-    QFile file(path);
-    if (!file.open(QIODevice::ReadOnly)) {
+    std::optional<QFile> file;
+    if (!kareport::whileMemoryLasts(false, [&] { return file.emplace(path).open(QIODevice::ReadOnly); })) {
         return 0;
     }
+    page_.losesNothing([&] { readLines(*file, namesRichText(path), keepLineEnds); });
+    file.reset();
+    const bool hasLostText = HasLostText();
+    UpdateAllViews(nullptr, 0, nullptr); // may hand the report to an editor and close it
+    return hasLostText ? 0 : 1;
+}
+
+void UReportDoc::readLines(QIODevice &file, bool mayBeRichText, bool keepLineEnds)
+{
     kareport::ReportFileReader reader(file);
     bool isRichText = false;
     bool isFirst = true;
@@ -89,7 +104,7 @@ int UReportDoc::LoadFile(const QString &path, bool keepLineEnds)
     while (reader.next()) {
         QLatin1StringView line = reader.piece();
         if (std::exchange(isFirst, false)) {
-            isRichText = namesRichText(path) && kareport::isRichText(QByteArrayView(line.trimmed()));
+            isRichText = mayBeRichText && kareport::isRichText(QByteArrayView(line.trimmed()));
         }
         isOpen = isRichText && !line.endsWith(u'\n');
         if (isOpen) {
@@ -111,7 +126,4 @@ int UReportDoc::LoadFile(const QString &path, bool keepLineEnds)
         page_.lineFeed(1);
         page_.countLine();
     }
-    const bool hasLostText = HasLostText();
-    UpdateAllViews(nullptr, 0, nullptr); // may hand the report to an editor and close it
-    return hasLostText ? 0 : 1;
 }

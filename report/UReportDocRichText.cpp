@@ -1,5 +1,6 @@
 #include "UReportDoc.h"
 
+#include "MemoryLasts.h"
 #include "SingleByteText.h"
 
 using kareport::RichTextImage;
@@ -10,32 +11,47 @@ RichTextImage::Form UReportDoc::imageForm() const
     return IsExternalExcel() ? RichTextImage::Form::BareText : RichTextImage::Form::RichText;
 }
 
+void UReportDoc::SetRTFDataFlag(bool on)
+{
+    page_.losesNothing([&] { image_.setOn(on); });
+}
+
+bool UReportDoc::ResetFormatString(QString &document)
+{
+    return kareport::whileMemoryLasts(false, [&document] { return RichTextImage::cutToParagraph(document); });
+}
+
 void UReportDoc::WriteRTFData(const QString &text, int style)
 {
-    image_.write(text, style, imageForm());
+    if (!image_.write(text, style, imageForm())) {
+        page_.noteLostText();
+    }
 }
 
 void UReportDoc::GetRTFData(QString &document) const
 {
-    document = image_.document(fontName_, fontSize_, imageForm());
+    document =
+        kareport::whileMemoryLasts(QString(), [this] { return image_.document(fontName_, fontSize_, imageForm()); });
 }
 
 void UReportDoc::GetFontTableData(QString &table) const
 {
-    table = RichTextImage::fontTable(fontName_, fontSize_);
+    table = kareport::whileMemoryLasts(QString(), [this] { return RichTextImage::fontTable(fontName_, fontSize_); });
 }
 
 bool UReportDoc::WriteFontTable(QIODevice &device) const
 {
-    QString table;
-    GetFontTableData(table);
-    return kareport::writeSingleByteText(device, table, WideCharacters::RichTextEscape);
+    return kareport::whileMemoryLasts(false, [&] {
+        return kareport::writeSingleByteText(device, RichTextImage::fontTable(fontName_, fontSize_),
+                                             WideCharacters::RichTextEscape);
+    });
 }
 
 bool UReportDoc::WriteRichTextFile(QIODevice &device) const
 {
-    QString document;
-    GetRTFData(document);
-    return kareport::writeSingleByteText(
-        device, document, IsExternalExcel() ? WideCharacters::QuestionMark : WideCharacters::RichTextEscape);
+    return !HasLostText() && kareport::whileMemoryLasts(false, [&] {
+        return kareport::writeSingleByteText(device, image_.document(fontName_, fontSize_, imageForm()),
+                                             IsExternalExcel() ? WideCharacters::QuestionMark
+                                                               : WideCharacters::RichTextEscape);
+    });
 }

@@ -3,10 +3,11 @@
 #include "DataWriter.h"
 #include "FieldFormatter.h"
 #include "Folders.h"
+#include "MemoryLasts.h"
 
 #include <QDir>
 
-#include <new>
+#include <utility>
 
 namespace
 {
@@ -23,7 +24,14 @@ QString fileIn(QString folder, const QString &fileName)
 
 bool UReportDoc::LoadTemplateXml(const QString &fileName, const QString &templateName, const QString &tableName,
                                  const QString &blockName)
-try {
+{
+    return kareport::whileMemoryLasts(false,
+                                      [&] { return loadTemplate(fileName, templateName, tableName, blockName); });
+}
+
+bool UReportDoc::loadTemplate(const QString &fileName, const QString &templateName, const QString &tableName,
+                              const QString &blockName)
+{
     // The handles point into the template that goes: they go with it.
     table_.reset();
     block_.reset();
@@ -43,37 +51,49 @@ try {
     if (!blockName.isEmpty() && !LoadTemplateBlock(blockName)) {
         return false;
     }
+    const quint64 losses = page_.losses();
     SetTitle(template_->GetTemplateTitle());
-    return true;
-} catch (const std::bad_alloc &) {
-    return false;
+    return page_.losses() == losses;
 }
 
 bool UReportDoc::LoadTemplateTable(const QString &tableName)
-try {
-    if (!template_) {
-        return false;
-    }
-    table_ = std::make_unique<UXmlReportTable>();
-    table_->SetColumnSeparator(static_cast<char>(separator_ & 0xFF));
-    if (!table_->LoadTable(tableName, template_.get())) {
-        return false;
-    }
-    if (template_->SetNorthEastTableFieldOrder(tableName, static_cast<ORIENTATION_ORDER>(settings_.northEastOrder))) {
-        table_->ReorderingHeading();
-    }
-    return true;
-} catch (const std::bad_alloc &) {
-    return false;
+{
+    table_.reset();
+    return kareport::whileMemoryLasts(false, [&] {
+        if (!template_) {
+            return false;
+        }
+        auto table = std::make_unique<UXmlReportTable>();
+        table->SetColumnSeparator(static_cast<char>(separator_ & 0xFF));
+        if (!table->LoadTable(tableName, template_.get())) {
+            return false;
+        }
+        if (template_->SetNorthEastTableFieldOrder(tableName, static_cast<ORIENTATION_ORDER>(settings_.northEastOrder)))
+        {
+            table->ReorderingHeading();
+        }
+        if (!table->IsLoaded()) {
+            return false;
+        }
+        table_ = std::move(table); // not before it is whole: what cannot be loaded is not written either
+        return true;
+    });
 }
 
 bool UReportDoc::LoadTemplateBlock(const QString &blockName)
 {
-    if (!template_) {
-        return false;
-    }
-    block_ = std::make_unique<UXmlReportBlock>();
-    return block_->LoadBlock(blockName, template_.get());
+    block_.reset();
+    return kareport::whileMemoryLasts(false, [&] {
+        if (!template_) {
+            return false;
+        }
+        auto block = std::make_unique<UXmlReportBlock>();
+        if (!block->LoadBlock(blockName, template_.get())) {
+            return false;
+        }
+        block_ = std::move(block);
+        return true;
+    });
 }
 
 kareport::FormatOptions UReportDoc::formatOptions() const
@@ -83,24 +103,35 @@ kareport::FormatOptions UReportDoc::formatOptions() const
 
 QString UReportDoc::FormatXmlStringToDisplay(const sXmlReportField *field, int kind, const void *value,
                                              const QString &offsetStyle) const
-try {
-    kareport::TextBuffer text;
-    kareport::FieldFormatter(*field).append(text, formatOptions(), kind, value, offsetStyle);
-    return text.view().toString();
-} catch (const std::bad_alloc &) {
-    return QString(); // a column of a template may be wider than there is memory
+{
+    // A column of a template may be wider than there is memory.
+    return kareport::whileMemoryLasts(QString(), [&] {
+        kareport::TextBuffer text;
+        kareport::FieldFormatter(*field).append(text, formatOptions(), kind, value, offsetStyle);
+        return text.view().toString();
+    });
+}
+
+/// Writes data. @return whether all of it was written
+template <typename Work>
+bool UReportDoc::writeData(Work write)
+{
+    if (page_.losesNothing(write)) {
+        return true;
+    }
+    page_.setHeading({QString(), 0, 2}); // a table's own must not stand over what is written next
+    return false;
 }
 
 bool UReportDoc::WriteDataBlock(const UDataObject *object, int linesBefore, int linesAfter)
-try {
+{
     if (!block_ || !block_->IsLoaded() || object == nullptr) {
         return false;
     }
-    const kareport::FormatOptions options = formatOptions();
-    kareport::DataWriter(page_, options).writeBlock(*block_, *object, linesBefore, linesAfter);
-    return true;
-} catch (const std::bad_alloc &) {
-    return false;
+    return writeData([&] {
+        const kareport::FormatOptions options = formatOptions();
+        kareport::DataWriter(page_, options).writeBlock(*block_, *object, linesBefore, linesAfter);
+    });
 }
 
 bool UReportDoc::WriteDataBlock(const QString &blockName, const UDataObject *object, int linesBefore, int linesAfter)
@@ -109,18 +140,15 @@ bool UReportDoc::WriteDataBlock(const QString &blockName, const UDataObject *obj
 }
 
 bool UReportDoc::WriteDataTable(UDataObjectList *list, int linesBefore, int linesAfter, int headingLinesAfter)
-try {
+{
     if (!table_ || !table_->IsLoaded() || list == nullptr) {
         return false;
     }
-    const kareport::FormatOptions options = formatOptions();
-    kareport::DataWriter(page_, options)
-        .writeTable(*table_, *list, {linesBefore, linesAfter, headingLinesAfter, chainageLabel_, writeTableName_});
-    return true;
-} catch (const std::bad_alloc &) {
-    page_.noteLostText();
-    page_.setHeading({QString(), 0, 2}); // the table's own must not stand over what is written next
-    return false;
+    return writeData([&] {
+        const kareport::FormatOptions options = formatOptions();
+        kareport::DataWriter(page_, options)
+            .writeTable(*table_, *list, {linesBefore, linesAfter, headingLinesAfter, chainageLabel_, writeTableName_});
+    });
 }
 
 bool UReportDoc::WriteDataTable(const QString &tableName, UDataObjectList *list, int linesBefore, int linesAfter,

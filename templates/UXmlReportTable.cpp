@@ -1,5 +1,6 @@
 #include "UXmlReportTable.h"
 
+#include "MemoryLasts.h"
 #include "TemplateText.h"
 
 #include <algorithm>
@@ -31,8 +32,8 @@ bool UXmlReportTable::LoadTable(const QString &tableName, const UXmlReportTpl *r
     }
     option_ = reportTemplate->GetOption();
     sortList_ = reportTemplate->GetSortList(tableName);
-    CreateHeading();
-    return true;
+    ReorderingHeading();
+    return IsLoaded();
 }
 
 sXmlReportField UXmlReportTable::GetField(int index) const
@@ -47,12 +48,14 @@ int UXmlReportTable::GetFieldsCount() const
 
 void UXmlReportTable::ReorderingHeading()
 {
-    CreateHeading();
+    if (!kareport::doneWhileMemoryLasts([this] { CreateHeading(); })) {
+        table_ = nullptr; // a table without its heading, or with one of other columns, is none
+    }
 }
 
 void UXmlReportTable::CreateHeading()
 {
-    const QString separator = option_ != nullptr ? GetColumnSeparator() : QStringLiteral(" ");
+    const QString separator(option_ != nullptr ? QLatin1Char(ColumnSeparator) : QLatin1Char(' '));
     const bool fill = separator != u"\t";
     QString heading;
     for (int i = 0; i < GetFieldsCount(); ++i) {
@@ -71,17 +74,18 @@ void UXmlReportTable::CreateHeading()
     }
 }
 
-void UXmlReportTable::GetSortList(std::vector<quint32> &ids) const
+bool UXmlReportTable::GetSortList(std::vector<quint32> &ids) const
 {
     ids.clear();
-    if (sortList_ != nullptr) {
-        for (const sXmlSortVariable &entry : sortList_->Entries) {
-            ids.push_back(entry.ID);
-        }
-    }
+    return sortList_ == nullptr || kareport::doneWhileMemoryLasts([&] {
+               ids.reserve(sortList_->Entries.size());
+               for (const sXmlSortVariable &entry : sortList_->Entries) {
+                   ids.push_back(entry.ID);
+               }
+           });
 }
 
 QString UXmlReportTable::GetColumnSeparator() const
 {
-    return QString(QLatin1Char(ColumnSeparator));
+    return kareport::whileMemoryLasts(QString(), [this] { return QString(QLatin1Char(ColumnSeparator)); });
 }

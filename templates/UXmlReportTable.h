@@ -32,7 +32,8 @@ public:
     void ReorderingHeading();
 
     /// Replaces `ids` by the dictionary identifiers of the sort keys, none when the table is not sorted.
-    void GetSortList(std::vector<quint32> &ids) const;
+    /// @return false, with none, when memory ends
+    bool GetSortList(std::vector<quint32> &ids) const;
 
     /// The column separator as a text of one character.
     QString GetColumnSeparator() const;

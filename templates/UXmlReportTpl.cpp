@@ -1,5 +1,6 @@
 #include "UXmlReportTpl.h"
 
+#include "MemoryLasts.h"
 #include "TemplateElements.h"
 #include "TemplateFile.h"
 #include "TemplateRecords.h"
@@ -37,18 +38,19 @@ UXmlReportTpl::~UXmlReportTpl() = default;
 
 bool UXmlReportTpl::LoadTemplate(const QString &fileName, const QString &templateName)
 {
-    const auto text = kareport::TemplateFile::readScanned(fileName);
-    if (!text || templateName.isEmpty()) {
+    const bool isLoaded = kareport::whileMemoryLasts(false, [&] {
+        const auto text = kareport::TemplateFile::readScanned(fileName);
+        if (!text || templateName.isEmpty()) {
+            return false;
+        }
+        name_ = templateName;
+        xml_ = kareport::ScanText(*text);
+        return ReadXmlData();
+    });
+    if (!isLoaded) {
         CleanData(false);
-        return false;
     }
-    name_ = templateName;
-    xml_ = kareport::ScanText(*text);
-    if (!ReadXmlData()) {
-        CleanData(false);
-        return false;
-    }
-    return true;
+    return isLoaded;
 }
 
 bool UXmlReportTpl::SetXml(const QString &xml)
@@ -158,7 +160,8 @@ void UXmlReportTpl::ReadSortData()
 bool UXmlReportTpl::FindVariable(const QString &dictionaryName, const QString &variableName, qint32 &id,
                                  qint32 &type) const
 {
-    return GetDicInfo(variablesOf(dictionaryName), variableName, id, type);
+    return kareport::whileMemoryLasts(false,
+                                      [&] { return GetDicInfo(variablesOf(dictionaryName), variableName, id, type); });
 }
 
 /// The variables of all dictionaries of a name; null when there is none.
@@ -254,17 +257,21 @@ QString UXmlReportTpl::GetTemplateTitle() const
 void UXmlReportTpl::GetAllTPLsByName(QStringList &names) const
 {
     names.clear();
-    for (const auto &info : templates_) {
-        names.append(info.Name);
-    }
+    kareport::doneWhileMemoryLasts([&] {
+        for (const auto &info : templates_) {
+            names.append(info.Name);
+        }
+    });
 }
 
 void UXmlReportTpl::GetAllTPLsByTitle(QStringList &titles) const
 {
     titles.clear();
-    for (const auto &info : templates_) {
-        titles.append(info.Title);
-    }
+    kareport::doneWhileMemoryLasts([&] {
+        for (const auto &info : templates_) {
+            titles.append(info.Title);
+        }
+    });
 }
 
 void UXmlReportTpl::GetAllTables(QStringList &names) const

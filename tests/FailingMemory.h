@@ -1,9 +1,13 @@
 #pragma once
 
+#include <algorithm>
 #include <cstddef>
 #include <cstdlib>
+#include <cstring>
+#include <unordered_map>
 
-/// Memory whose n-th request is refused. One at a time.
+/// Memory whose n-th request is refused, and that lies elsewhere after each other one: what still reads the old place finds
+/// letters. One at a time.
 class FailingMemory
 {
 public:
@@ -18,7 +22,7 @@ public:
     {
         if (left != 1) {
             left -= left > 1 ? 1 : 0;
-            return std::realloc(memory, bytes);
+            return moved(memory, bytes);
         }
         left = isAlone ? 0 : 1;
         hasRefused = true;
@@ -28,4 +32,19 @@ public:
     static inline int left = 0;
     static inline bool isAlone = false;
     static inline bool hasRefused = false; ///< since `refuse`
+
+private:
+    static void *moved(void *memory, std::size_t bytes)
+    {
+        void *place = std::malloc(bytes);
+        if (memory != nullptr && place != nullptr) {
+            std::memcpy(place, memory, std::min(bytes, sizes[memory]));
+            std::memset(memory, 'z', sizes[memory]);
+            std::free(memory);
+        }
+        sizes[place] = bytes;
+        return place;
+    }
+
+    static inline std::unordered_map<void *, std::size_t> sizes;
 };

@@ -180,13 +180,19 @@ TEST(PageWriterHeading, ClearingEmptiesTextAndHeadingAndBeginsPageOneWithTheNext
 class Recorder : public kareport::PageWriterObserver
 {
 public:
-    void textWritten(QStringView text, int style) override
+    bool textWritten(QStringView text, int style) override
     {
         calls += QStringLiteral("[%1 %2]").arg(style).arg(text.toString());
+        return hasMemory;
     }
-    void lineEnded() override { calls += u'/'; }
+    bool lineEnded() override
+    {
+        calls += u'/';
+        return hasMemory;
+    }
     void changed() override { calls += u'!'; }
     QString calls;
+    bool hasMemory = true;
 };
 
 TEST(PageWriterHeading, TheObserverIsToldEveryPieceInOrder)
@@ -229,6 +235,30 @@ TEST(PageWriterHeading, TheObserverIsNotToldWhatCouldNotBeWritten)
     writer.lineFeed(3);
     EXPECT_EQ(recorder.calls, QString());
     EXPECT_EQ(memory.largest, LimitedMemory::bytesFor(32000));
+}
+
+TEST(PageWriterHeading, WhatTheObserverHasNoMemoryForIsNotWritten)
+{
+    Recorder recorder;
+    PageWriter writer(&recorder);
+    writer.writeLine(u"before", 0, 1, 0);
+    recorder.hasMemory = false;
+    EXPECT_FALSE(writer.write(u"a\nb", 0));
+    EXPECT_FALSE(writer.write(QLatin1StringView("a\nb"), 0));
+    EXPECT_FALSE(writer.write(QStringView(u"\u6E2C"), 0)) << "also where the text had to become UTF-16";
+    EXPECT_FALSE(writer.write(writer.text().view().first(3), 0)) << "a piece of the text itself";
+    writer.lineFeed(2);
+    EXPECT_EQ(writer.text().view().toString(), QStringLiteral("before\r\n"));
+    EXPECT_EQ(writer.lineCount(), 1);
+    EXPECT_EQ(writer.lineNumber(), 2);
+    EXPECT_TRUE(writer.hasLostText());
+    EXPECT_EQ(writer.losses(), 5U) << "of the line feeds, the second is not tried";
+    recorder.hasMemory = true;
+    EXPECT_TRUE(writer.write(u"after", 0));
+    EXPECT_EQ(writer.text().view().toString(), QStringLiteral("before\r\nafter"));
+    EXPECT_TRUE(writer.hasLostText()) << "until it is emptied";
+    writer.clear();
+    EXPECT_FALSE(writer.hasLostText());
 }
 
 } // namespace

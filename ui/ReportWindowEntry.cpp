@@ -1,5 +1,6 @@
 #include "ReportWindowEntry.h"
 
+#include "MemoryLasts.h"
 #include "NewReport.h"
 #include "RememberedView.h"
 #include "UReportDoc.h"
@@ -12,12 +13,16 @@ UReportDoc *CreateReportWindow(const QString &name, bool headerFlag, bool extern
     const kareport::RememberedView activeView = kareport::RememberedView::active();
     UReportDoc *report =
         kareport::openNewReport({name, headerFlag, externalEditor}, false, nullptr, UReportDoc::ownPaneStyle, nullptr);
-    if (report != nullptr) {
-        auto window = std::make_unique<UReportWindowDlg>();
-        if (window->createDocked(name, activeView.get())) {
-            window->SetReportDoc(report);
-            report->SetReportWindow(window.release());
-        }
+    const bool isMade = report != nullptr && kareport::doneWhileMemoryLasts([&] {
+                            auto window = std::make_unique<UReportWindowDlg>();
+                            if (window->createDocked(name, activeView.get())) {
+                                window->SetReportDoc(report);
+                                report->SetReportWindow(window.release());
+                            }
+                        });
+    if (report != nullptr && !isMade) {
+        report->OnCloseDocument();
+        report = nullptr;
     }
     activeView.reactivate();
     return report;

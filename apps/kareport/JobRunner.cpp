@@ -85,7 +85,7 @@ public:
             failWithoutRow(step.data);
         }
         if (object != nullptr && !failed()) {
-            report_.WriteDataBlock(step.name, object, step.before, step.after);
+            needMemory(report_.WriteDataBlock(step.name, object, step.before, step.after));
         }
     }
 
@@ -99,12 +99,20 @@ public:
         }
         const auto list = openData(step.data, table->Use, false);
         if (list && !takeError(list.get()) && !failed()) {
-            report_.WriteDataTable(step.name, list.get(), step.before, step.after, step.headingAfter);
+            needMemory(report_.WriteDataTable(step.name, list.get(), step.before, step.after, step.headingAfter));
             takeError(list.get());
         }
     }
 
 private:
+    /// What has been found writable is not written for one reason only.
+    static void needMemory(bool isWritten)
+    {
+        if (!isWritten) {
+            throw std::bad_alloc();
+        }
+    }
+
     bool failed() const { return error_ || runner_.source_.failed(); }
 
     template <typename Record, typename GetNames>

@@ -42,7 +42,7 @@ public:
         if (output_.isStandardOutput()) {
             return writeStandardOutput();
         }
-        if (output_.kind == OutputKind::Report && report_.IsEmpty()) {
+        if (output_.kind == OutputKind::Report && report_.IsEmpty() && !report_.HasLostText()) {
             // Saving an empty report makes no file.
             return std::nullopt;
         }
@@ -80,6 +80,9 @@ private:
 
     bool writeTo(QIODevice &device)
     {
+        if (report_.HasLostText()) {
+            return false; // half a report is none
+        }
         switch (output_.kind) {
         case OutputKind::Report: return report_.WriteText(device, LineEnds::ReportFile);
         case OutputKind::Text: return report_.WriteText(device, LineEnds::PlainText);

@@ -6,6 +6,46 @@
 
 #include <algorithm>
 
+namespace
+{
+
+/// Closes a pane whose document stays.
+struct CloseUnfinishedPane
+{
+    UDocument *document;
+    void operator()(CViewPane *pane) const
+    {
+        if (!CViewPane::IsOpen(pane)) {
+            return;
+        }
+        const bool autoDelete = document->IsAutoDelete();
+        document->SetAutoDelete(false);
+        pane->ClosePane();
+        document->SetAutoDelete(autoDelete);
+    }
+};
+using UnfinishedPane = std::unique_ptr<CViewPane, CloseUnfinishedPane>;
+
+} // namespace
+
+/// A document that is being made: it goes again, with its views, where that fails.
+struct UDocTemplate::UnfinishedDocument
+{
+    UDocument *document;
+    CViewPane *pane; ///< that was given; null for one of its own
+
+    UnfinishedDocument(UDocument *made, CViewPane *given) : document(made), pane(given) {}
+    ~UnfinishedDocument()
+    {
+        while (document != nullptr && CViewPane::IsOpen(pane) && !document->GetViews().empty()) {
+            pane->RemoveView(document->GetViews().front());
+        }
+        delete document;
+    }
+    UnfinishedDocument(const UnfinishedDocument &) = delete;
+    UnfinishedDocument &operator=(const UnfinishedDocument &) = delete;
+};
+
 UDocTemplate::UDocTemplate(unsigned resourceId, DocumentFactory makeDocument, PaneFactory makePane,
                            ViewFactory makeView, QString creatorName, int /*savesInFrame*/, int /*reserved*/)
     : resourceId_(resourceId),
@@ -41,38 +81,33 @@ UDocument *UDocTemplate::OpenReportDocumentFile(const QString &path, int /*addTo
     if (!made) {
         return nullptr;
     }
-    UDocument *document = made.release();
+    UDocument *document = made.get();
     document->docTemplate_ = this;
     documents_.push_back(document);
-
-    const bool ownPane = pane == nullptr;
-    if (ownPane) {
-        pane = CreateNewPane(document, nullptr, style, rect);
-    } else {
-        ShowIn(pane, document);
-    }
-
+    UnfinishedDocument unfinished(made.release(), pane);
     // While it is being filled, the document must not go with a pane that closes.
     const bool autoDelete = document->IsAutoDelete();
     document->SetAutoDelete(false);
-    const bool filled = path.isEmpty() ? document->OnNewDocument() : document->OnOpenDocument(path);
-    if (!filled) {
-        if (CViewPane::IsOpen(pane) && ownPane) {
-            pane->ClosePane();
-        }
-        while (!ownPane && !document->GetViews().empty()) {
-            pane->RemoveView(document->GetViews().front());
-        }
-        delete document;
+
+    UnfinishedPane ownPane(nullptr, {document});
+    if (pane == nullptr) {
+        pane = CreateNewPane(document, nullptr, style, rect);
+        ownPane.reset(pane);
+    } else {
+        ShowIn(pane, document);
+    }
+    if (path.isEmpty() ? !document->OnNewDocument() : !document->OnOpenDocument(path)) {
         return nullptr;
     }
-    document->SetAutoDelete(autoDelete);
     if (!path.isEmpty()) {
         document->SetPathName(path, true);
     }
     if (CViewPane::IsOpen(pane)) {
         InitialUpdatePane(pane, document, makeVisible);
     }
+    ownPane.release();
+    unfinished.document = nullptr;
+    document->SetAutoDelete(autoDelete);
     return document;
 }
 
@@ -81,14 +116,14 @@ CViewPane *UDocTemplate::CreateNewPane(UDocument *document, CViewPane *parent, u
     if (!makePane_ || !makeView_) {
         return nullptr;
     }
-    CViewPane *pane = makePane_();
-    if (pane != nullptr) {
+    UnfinishedPane pane(makePane_(), {document});
+    if (pane) {
         pane->SetPlace(parent, style, rect);
-        ShowIn(pane, document);
+        ShowIn(pane.get(), document);
         // Not through the document's own SetTitle, which a report takes for a new title.
         pane->SetWindowTextW(static_cast<const UDocument *>(document)->GetTitle());
     }
-    return pane;
+    return pane.release();
 }
 
 void UDocTemplate::ShowIn(CViewPane *pane, UDocument *document)

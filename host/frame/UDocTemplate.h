@@ -52,6 +52,7 @@ public:
 
 private:
     friend class UDocument;
+    struct UnfinishedDocument;
 
     void Forget(UDocument *document);
     void ShowIn(CViewPane *pane, UDocument *document);
