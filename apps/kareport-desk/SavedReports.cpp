@@ -21,21 +21,26 @@ namespace
 {
 
 /// The text of a report file as it was before it was saved: each line end once, and UTF-8 as the characters that it stands
-/// for. Nothing for rich text and for what is no UTF-8, which the report loads byte by byte.
-std::optional<QString> exactText(const QString &path)
+/// for. Nothing for rich text and for what is no UTF-8, which the report loads byte by byte. An error when the file cannot
+/// be read, or is cut short meanwhile: what is left of it is not what was saved.
+Expected<std::optional<QString>> exactText(const QString &path)
 {
-    const auto file = FileBytes::open(path);
-    if (errorOf(file) != nullptr || path.endsWith(u".rtf", Qt::CaseInsensitive)) {
+    if (path.endsWith(u".rtf", Qt::CaseInsensitive)) {
         return std::nullopt;
+    }
+    const auto file = FileBytes::open(path);
+    if (const InputError *error = errorOf(file)) {
+        return *error;
     }
     const auto &saved = *std::get<std::shared_ptr<const FileBytes>>(file);
     const std::string_view view = saved.view();
     QString text;
     const QByteArrayView bytes(view.data(), static_cast<qsizetype>(view.size()));
-    if (decodeReportText(bytes, text) || isRichText(text) || saved.lostBytes()) {
-        return std::nullopt;
+    const bool isOther = decodeReportText(bytes, text) || isRichText(text);
+    if (const auto lost = saved.lostBytes()) {
+        return *lost;
     }
-    return text;
+    return isOther ? std::nullopt : std::optional(std::move(text));
 }
 
 void fill(UReportDoc &report, const QString &text)
@@ -68,7 +73,11 @@ UReportDoc *openSavedReport(const QString &path)
     if (!whyNotOpened(path).isEmpty()) {
         return nullptr;
     }
-    const auto text = exactText(path);
+    const auto read = exactText(path);
+    if (errorOf(read) != nullptr) {
+        return nullptr;
+    }
+    const auto &text = std::get<std::optional<QString>>(read);
     if (!text) {
         return dynamic_cast<UReportDoc *>(GetReportTemplate()->OpenReportDocumentFile(path, 1, 1, nullptr, 0, nullptr));
     }
@@ -86,7 +95,11 @@ bool reloadSavedReport(UReportDoc &report)
     if (!whyNotOpened(report.GetPathName()).isEmpty() || !QFile(report.GetPathName()).open(QIODevice::ReadOnly)) {
         return false; // what is shown is then all that there is
     }
-    if (const auto text = exactText(report.GetPathName())) {
+    const auto read = exactText(report.GetPathName());
+    if (errorOf(read) != nullptr) {
+        return false;
+    }
+    if (const auto &text = std::get<std::optional<QString>>(read)) {
         fill(report, *text);
         return true;
     }
