@@ -27,6 +27,8 @@ TEST(CommandLineProcess, NoFileTakesTheNumberOfAClosedDescriptor)
     const Row rows[] = {
         {"render job.json -o out.txt --progress", {2}, 0, "messages would stand in the report"},
         {"render job.json -o out.txt --progress", {0, 1, 2}, 0, "all of them"},
+        {"render job.json -o out.txt --progress", {0, 2}, 0, "the output would be the second file that is opened"},
+        {"render job.json -o out.txt --progress", {1, 2}, 0, "the same"},
         {"render job.json -o out.txt --progress", {0}, 0, "the first file opened would be standard input"},
         {"render job.json -o -", {1}, 3, "a report for nobody is not written"},
         {"render job.json -o -", {0, 1, 2}, 3, "and nobody is told"},

@@ -65,7 +65,7 @@ TEST(ReplaceFilePosix, AFullDiskLeavesTheOldFile)
                 path, [&](QIODevice &device) { return device.write(QByteArray(disk.size, 'x')) == disk.size; }, &error);
         }
         EXPECT_EQ(done, disk.fits) << disk.reason;
-        EXPECT_EQ(error.isEmpty(), disk.fits) << disk.reason;
+        EXPECT_EQ(error, disk.fits ? QString() : QStringLiteral("File too large")) << disk.reason;
         EXPECT_EQ(contentOf(path), disk.fits ? std::string(100, 'x') : "old content") << disk.reason;
         EXPECT_EQ(filesIn(folder), 1) << disk.reason;
     }
