@@ -96,6 +96,10 @@ qreal PageRows::plainWidth() const
     qreal width = 0;
     for (const Run &run : runs_) {
         const QStringView text = QStringView(line_).mid(run.from, run.length);
+        if (hasGlyphs(*run.face, text)) {
+            width += qreal(run.face->pitch) * run.length; // what has a glyph of its own is plain
+            continue;
+        }
         if (!std::all_of(text.begin(), text.end(), [](QChar character) { return isPlain(character.unicode()); })) {
             return -1;
         }

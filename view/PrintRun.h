@@ -5,6 +5,8 @@
 
 #include <QPaintDevice>
 #include <QPointer>
+#include <QRect>
+#include <QSize>
 #include <QTextDocument>
 
 #include <vector>
@@ -19,14 +21,17 @@ struct PrintRun
         : document(&text), revision(text.revision()), pager(text, device)
     {}
 
-    /// Whether it is about this text as it is now, on this device.
+    /// Whether it is about this text as it is now, on this device as it is set up.
     bool isFor(const QTextDocument &text, const QPaintDevice &device) const
     {
-        return document == &text && revision == text.revision() && &pager.device() == &device;
+        return document == &text && revision == text.revision() && &pager.device() == &device &&
+               resolution == QSize(device.logicalDpiX(), device.logicalDpiY());
     }
 
     QPointer<QTextDocument> document;
     int revision;
+    QSize resolution; ///< of the device
+    QRect room;       ///< of the sheets, in twips
     LinePager pager;
     std::vector<PrintSheet> sheets; ///< empty where the lines flow from sheet to sheet
 };

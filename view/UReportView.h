@@ -121,7 +121,7 @@ private:
     bool loadInPieces();
     void noteMirrored();
     QRect printableRect() const; ///< twips
-    std::unique_ptr<kareport::PrintRun> makeRun(QPaintDevice &device) const;
+    void prepareRun(QPaintDevice *device);
     /// The sheets of a report whose page was given; empty where the lines flow from sheet to sheet.
     std::vector<kareport::PrintSheet> givenSheets(kareport::LinePager &pager) const;
     /// Does something with a pager for a device: the one of the job, where it is about that device.

@@ -187,6 +187,9 @@ void UReportView::OnReportPrintPreview()
             sayOutcome(outcome, nameOf(printer));
         }
     });
+    if (text.isOpen()) {
+        run_.reset(); // the printer goes
+    }
 }
 
 bool UReportView::OnPreparePrinting(PrintInfo &info)
@@ -212,22 +215,30 @@ bool UReportView::OnPreparePrinting(PrintInfo &info)
         }
     }
     if (report->IsPageFixed()) {
-        const std::size_t sheets = makeRun(*info.printer)->sheets.size();
-        info.maxPage = sheets > 0 ? static_cast<int>(sheets) : info.maxPage;
+        prepareRun(info.printer);
+        info.maxPage = printsGivenPages() ? static_cast<int>(run_->sheets.size()) : info.maxPage;
     }
     if (info.preview) {
         return true;
     }
     const PrintedText text(*this);
     const QSize sheet = kareport::sheetInTwips(*info.printer);
-    if (!info.direct && (!kareport::askPrint(*info.printer, info.maxPage, GetWidget()) || !text.isOpen())) {
-        return false;
+    if (!info.direct) {
+        const bool isWanted = kareport::askPrint(*info.printer, info.maxPage, GetWidget());
+        if (!text.isOpen()) {
+            return false;
+        }
+        if (!isWanted) {
+            run_.reset(); // the printer goes
+            return false;
+        }
     }
     info.printer->setFullPage(true);
     if (kareport::sheetInTwips(*info.printer) != sheet) {
         m_sizePaper = kareport::sheetInTwips(*info.printer); // another one was chosen for this job
     }
     if (!kareport::leavesRoom(m_sizePaper, m_rectMargin)) {
+        run_.reset();
         sayNoRoom();
         return false;
     }
@@ -237,7 +248,7 @@ bool UReportView::OnPreparePrinting(PrintInfo &info)
 void UReportView::OnBeginPrinting(QPainter &painter, PrintInfo &info)
 {
     m_aPageStart.assign(1, 0);
-    run_ = painter.device() == nullptr ? nullptr : makeRun(*painter.device());
+    prepareRun(painter.device());
     if (!printsGivenPages()) {
         return;
     }
@@ -314,12 +325,19 @@ QRect UReportView::printableRect() const
     return kareport::printableRect(m_sizePaper, m_rectMargin);
 }
 
-std::unique_ptr<kareport::PrintRun> UReportView::makeRun(QPaintDevice &device) const
+void UReportView::prepareRun(QPaintDevice *device)
 {
-    auto run = std::make_unique<kareport::PrintRun>(*GetEdit().document(), device);
-    run->pager.setUsualLines(GetDocument() == nullptr ? 0 : GetDocument()->GetLinesPerPage());
-    run->sheets = givenSheets(run->pager);
-    return run;
+    QTextDocument &text = *GetEdit().document();
+    if (device != nullptr && run_ != nullptr && run_->isFor(text, *device) && run_->room == printableRect()) {
+        return; // as it was prepared for
+    }
+    run_.reset();
+    if (device != nullptr) {
+        run_ = std::make_unique<kareport::PrintRun>(text, *device);
+        run_->room = printableRect();
+        run_->pager.setUsualLines(GetDocument() == nullptr ? 0 : GetDocument()->GetLinesPerPage());
+        run_->sheets = givenSheets(run_->pager);
+    }
 }
 
 std::vector<kareport::PrintSheet> UReportView::givenSheets(kareport::LinePager &pager) const
