@@ -57,7 +57,9 @@ void exportPdf(const UReportDoc &report, const QString &path)
     PdfNotes notes;
     QString problem;
     bool isWritten = false;
-    if (report.IsEmpty()) {
+    if (report.HasLostText()) {
+        problem = Xlate("a part of the report was lost when memory ran out");
+    } else if (report.IsEmpty()) {
         problem = Xlate("the report is empty, and a PDF has one page at least");
     } else {
         const WaitCursor cursor;
