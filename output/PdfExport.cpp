@@ -1,9 +1,11 @@
 #include "PdfExport.h"
 
+#include "CharacterCells.h"
 #include "LineBreaker.h"
 #include "PdfDocument.h"
 #include "PdfText.h"
 #include "PdfTypesetter.h"
+#include "ReportPages.h"
 #include "Xlate.h"
 
 #include <QHash>
@@ -11,18 +13,14 @@
 #include <algorithm>
 #include <deque>
 #include <numeric>
+#include <span>
+#include <string>
 
 namespace kareport
 {
 
 namespace
 {
-
-/// Lines closer than this, in points, are no lines any more.
-constexpr float smallestLeading = 0.05F;
-
-/// Missing characters that are named; the others are counted.
-constexpr std::size_t mostWarnings = 20;
 
 /// Writes one text as a PDF.
 template <typename Text>
@@ -44,14 +42,18 @@ public:
         if (box_.right <= box_.left || box_.top <= box_.bottom) {
             return fail(Xlate("the margins leave no room on the page: smaller margins were expected"));
         }
-        if (!loadFaces()) {
+        const std::u32string characters = visibleCharacters(text_);
+        if (!loadFaces(characters)) {
             return false;
         }
-        const qint64 pages = std::max<qint64>(0, (options_.lineCount - 1 + setup.linesPerPage) / setup.linesPerPage);
-        const qint64 lines = linesOfText();
-        linesToFit_ = linesToFit(setup, box_, typesetter_.height(), lines);
-        pages_ = std::max(pages, pagesOfText());
-        if (!pdf_.expectPages(pages_) || !addPages()) {
+        const std::vector<ReportPage> pages = reportPages(text_, options_.pageStarts, setup.linesPerPage);
+        const qint64 lines = std::accumulate(pages.begin(), pages.end(), qint64(0),
+                                             [](qint64 sum, const ReportPage &page) { return sum + page.lines; });
+        chooseTypeSize(characters, lines);
+        // A sheet of a page's continuation holds a line, or a cell of a broken one, at least.
+        const qint64 sheets =
+            static_cast<qint64>(pages.size()) + lines + (notes_.broken.count > 0 ? 8 * text_.size() : 0);
+        if (!pdf_.expectPages(sheets) || !addPages(pages) || !typesetter_.finish()) {
             return fail(libraryError());
         }
         // A device that fails says why itself.
@@ -69,54 +71,57 @@ private:
 
     QString libraryError() const
     {
-        return Xlate("the PDF library failed with error %1")
-            .arg(QStringLiteral("0x%1").arg(QString::number(pdf_.error(), 16).toUpper()));
+        const QString face = typesetter_.failedFace();
+        return face.isEmpty() ? Xlate("the PDF library failed with error %1")
+                                    .arg(QStringLiteral("0x%1").arg(QString::number(pdf_.error(), 16).toUpper()))
+                              : Xlate("the font file \"%1\" cannot be used").arg(face);
     }
 
-    bool loadFaces()
+    bool loadFaces(const std::u32string &characters)
     {
-        const std::vector<CharacterCount> characters = visibleCharacters(text_);
         const auto preferred = preferredPdfFace(options_.fontFolders.value_or(systemFontFolders()));
-        const std::vector<PdfFace> faces = choosePdfFaces(preferred, fixedPitchPdfFaces(), characters);
+        const std::vector<PdfFace> faces = orderPdfFaces(preferred, fixedPitchPdfFaces());
         if (faces.empty()) {
             return fail(Xlate("no fixed-pitch font was found: DejaVu Sans Mono, Liberation Mono or Hack was expected"));
         }
-        if (!typesetter_.loadFaces(pdf_, faces)) {
-            return fail(Xlate("the font file \"%1\" cannot be used").arg(typesetter_.failedFace()));
-        }
-        for (const CharacterCount &entry : characters) {
-            if (!typesetter_.covers(entry.character)) {
-                uncovered_.push_back(entry.character);
-            } else {
-                widest_ = std::max(widest_, typesetter_.width(entry.character));
-            }
-        }
-        substitute_ =
-            typesetter_.covers(QChar::ReplacementCharacter) ? QChar(QChar::ReplacementCharacter) : QChar(u'?');
-        widest_ = std::max(widest_, typesetter_.width(substitute_.unicode()));
-        return true;
+        return typesetter_.begin(faces, characters) || fail(libraryError());
     }
 
-    qint64 linesOfText() const { return std::count(text_.begin(), text_.end(), typename Text::value_type('\n')) + 1; }
-
-    /// An edited text may have more lines than were counted when it was written; they get their pages, too.
-    qint64 pagesOfText() const
+    void chooseTypeSize(const std::u32string &characters, qint64 lines)
     {
-        const qint64 feeds = linesOfText() - 1;
-        const bool lineIsOpen = !text_.isEmpty() && text_.back() != QChar(u'\n');
-        return (feeds + (lineIsOpen ? 1 : 0) + options_.page.linesPerPage - 1) / options_.page.linesPerPage;
+        const PdfPageSetup &setup = options_.page;
+        const FaceHeight height = typesetter_.height();
+        linesToFit_ = linesToFit(setup, box_, height, lines);
+        fontSize_ = setup.fontSize;
+        const double size = placeLines(fontSize_, box_, height, linesToFit_, linesToFit_).fontSize;
+        cellsAcross_ = cellsAcross(box_, typesetter_.cell(), size);
+        const WideLines wide = wideLines(text_, characters, cellsAcross_);
+        if (wide.count == 0) {
+            return;
+        }
+        fontSize_ = sizeForCells(box_, typesetter_.cell(), size, wide.widest);
+        if (fontSize_ < size) {
+            notes_.reduced = {wide.count, wide.first, fontSize_};
+        }
+        cellsAcross_ = cellsAcross(box_, typesetter_.cell(), fontSize_);
+        const WideLines broken = wideLines(text_, characters, cellsAcross_);
+        if (broken.count > 0) {
+            notes_.broken = {broken.count, broken.first, fontSize_};
+        }
     }
 
-    bool addPages()
+    bool addPages(const std::vector<ReportPage> &pages)
     {
-        qsizetype begin = 0;
-        for (qint64 page = 0; page < pages_; ++page) {
-            const qsizetype end = pageEnd(text_, begin, options_.page.linesPerPage);
-            if (!addPage(begin, end)) {
+        qsizetype at = 0;
+        qint64 done = 0;
+        for (const ReportPage &page : pages) {
+            const auto begin = static_cast<qsizetype>(page.begin);
+            lineNumber_ += text_.sliced(at, begin - at).count(u'\n'); // lines that stand on no page
+            at = static_cast<qsizetype>(page.end);
+            if (!addPage(begin, at)) {
                 return false;
             }
-            begin = end;
-            if (options_.progress && !options_.progress(page + 1, pages_)) {
+            if (options_.progress && !options_.progress(++done, static_cast<qint64>(pages.size()))) {
                 return fail(Xlate("stopped"));
             }
         }
@@ -125,9 +130,7 @@ private:
 
     bool addPage(qsizetype begin, qsizetype end)
     {
-        const double width = (double(box_.right) - double(box_.left)) * 1000 / options_.page.fontSize;
         pieces_.clear();
-        const qint64 firstLine = lineNumber_;
         std::size_t line = 0;
         for (qsizetype at = begin; at < end; ++line) {
             const qsizetype feed = text_.indexOf(u'\n', at);
@@ -138,63 +141,55 @@ private:
             QString &visible = lines_[line];
             visibleLine(text_.sliced(at, lineEnd - at), visible);
             ++lineNumber_;
-            replaceUncovered(visible);
-            if (double(visible.size()) * widest_ <= width) {
-                pieces_.push_back(visible);
-            } else {
+            if (!typesetter_.coversAll()) {
+                typesetter_.findMissing(visible, [this](char32_t character) { noteMissing(character); });
+            }
+            if (notes_.broken.count > 0) {
                 breakLine(
-                    visible, width, [this](char32_t c) { return typesetter_.width(c); }, pieces_);
+                    visible, static_cast<double>(cellsAcross_), [](char32_t c) { return cellsOf(c); }, pieces_);
+            } else {
+                pieces_.push_back(visible);
             }
             at = lineEnd + 1;
         }
-        const LinePlacement placement =
-            placeLines(options_.page, box_, typesetter_.height(), linesToFit_, qsizetype(pieces_.size()));
-        if (placement.leading < smallestLeading) {
-            return fail(
-                Xlate("the lines %1 to %2 of the report become %3 when they are broken: they do not fit one page")
-                    .arg(QString::number(firstLine + 1), QString::number(lineNumber_),
-                         QString::number(pieces_.size())));
-        }
-        return typesetter_.addPage(pdf_, box_, placement, pieces_);
+        return addSheets();
     }
 
-    void replaceUncovered(QString &line)
+    bool addSheets()
     {
-        if (uncovered_.empty()) {
-            return;
+        const LinePlacement placement =
+            placeLines(fontSize_, box_, typesetter_.height(), linesToFit_, static_cast<qsizetype>(pieces_.size()));
+        std::span<const QStringView> left(pieces_);
+        do {
+            const auto taken = left.first(std::min(left.size(), static_cast<std::size_t>(placement.lines)));
+            if (!typesetter_.addPage(box_, placement, taken)) {
+                return false;
+            }
+            left = left.subspan(taken.size());
+        } while (!left.empty());
+        return true;
+    }
+
+    void noteMissing(char32_t character)
+    {
+        const auto known = missingAt_.constFind(character);
+        if (known != missingAt_.constEnd()) {
+            ++notes_.missing[*known].count;
+        } else {
+            missingAt_.insert(character, notes_.missing.size());
+            notes_.missing.push_back({character, 1, lineNumber_});
         }
-        QString shown;
-        for (const char32_t character : line.toUcs4()) {
-            if (!std::binary_search(uncovered_.begin(), uncovered_.end(), character)) {
-                shown += QChar::fromUcs4(character);
-                continue;
-            }
-            if (QChar::category(character) == QChar::Other_Format) {
-                continue; // a mark that is not seen where it is known either
-            }
-            shown += substitute_;
-            const auto known = missingAt_.constFind(character);
-            if (known != missingAt_.constEnd()) {
-                ++notes_.missing[*known].count;
-            } else {
-                missingAt_.insert(character, notes_.missing.size());
-                notes_.missing.push_back({character, 1, lineNumber_});
-            }
-        }
-        line = shown;
     }
 
     Text text_;
     const PdfOptions &options_;
     PdfNotes &notes_;
     PdfDocument pdf_;
-    PdfTypesetter typesetter_;
+    PdfTypesetter typesetter_{pdf_};
     PdfPageBox box_;
+    double fontSize_ = 0;
     qsizetype linesToFit_ = 1; ///< on a page
-    qint64 pages_ = 0;
-    int widest_ = 0;
-    std::vector<char32_t> uncovered_; ///< in order
-    QChar substitute_;
+    qint64 cellsAcross_ = 0;
     QHash<char32_t, std::size_t> missingAt_; ///< place among the notes
     qint64 lineNumber_ = 0;
     std::deque<QString> lines_; ///< of the page at hand, used again for every page
@@ -209,26 +204,6 @@ bool writeText(QIODevice &device, Text text, const PdfOptions &options, PdfNotes
 }
 
 } // namespace
-
-QStringList PdfNotes::warnings() const
-{
-    QStringList texts;
-    for (std::size_t i = 0; i < std::min(missing.size(), mostWarnings); ++i) {
-        const MissingCharacter &entry = missing[i];
-        const QString code = QString::number(entry.character, 16).toUpper().rightJustified(4, u'0');
-        texts += Xlate("no font has the character \"%1\" (U+%2), first in line %3, %4 times in all")
-                     .arg(QString::fromUcs4(&entry.character, 1), code, QString::number(entry.firstLine),
-                          QString::number(entry.count));
-    }
-    if (missing.size() > mostWarnings) {
-        const qint64 others =
-            std::accumulate(missing.begin() + mostWarnings, missing.end(), qint64(0),
-                            [](qint64 sum, const MissingCharacter &entry) { return sum + entry.count; });
-        texts += Xlate("no font has %1 other characters, %2 times in all")
-                     .arg(QString::number(missing.size() - mostWarnings), QString::number(others));
-    }
-    return texts;
-}
 
 bool writePdf(QIODevice &device, QStringView text, const PdfOptions &options, PdfNotes *notes)
 {

@@ -94,6 +94,16 @@ std::optional<PdfFace> faceOfFamily(const char *family)
                    best->file.endsWith(u".ttc", Qt::CaseInsensitive), coverageOf(best->pattern));
 }
 
+bool coversPlainText(const PdfFace &face)
+{
+    for (char32_t character = U' '; character <= U'~'; ++character) {
+        if (!face.covers(character)) {
+            return false;
+        }
+    }
+    return true;
+}
+
 } // namespace
 
 PdfFace::PdfFace(QString file, unsigned index, bool isCollection)
@@ -156,35 +166,18 @@ std::vector<PdfFace> fixedPitchPdfFaces()
     return faces;
 }
 
-std::vector<PdfFace> choosePdfFaces(const std::optional<PdfFace> &preferred, const std::vector<PdfFace> &others,
-                                    const std::vector<CharacterCount> &characters)
+std::vector<PdfFace> orderPdfFaces(const std::optional<PdfFace> &preferred, const std::vector<PdfFace> &others)
 {
-    std::vector<PdfFace> chosen;
-    std::vector<CharacterCount> left = characters;
-    const auto take = [&](const PdfFace &face) {
-        chosen.push_back(face);
-        std::erase_if(left, [&face](const CharacterCount &entry) { return face.covers(entry.character); });
-    };
-    const auto covered = [&left](const PdfFace &face) {
-        qint64 count = 0;
-        for (const CharacterCount &entry : left) {
-            count += face.covers(entry.character) ? entry.count : 0;
-        }
-        return count;
-    };
+    std::vector<PdfFace> faces = others;
     if (preferred) {
-        take(*preferred);
+        faces.insert(faces.begin(), *preferred);
+        return faces;
     }
-    while (!others.empty() && (chosen.empty() || !left.empty())) {
-        // The first of those that show most: the order of the faces decides where several show all.
-        const auto best = std::max_element(others.begin(), others.end(),
-                                           [&](const PdfFace &a, const PdfFace &b) { return covered(a) < covered(b); });
-        if (!chosen.empty() && covered(*best) == 0) {
-            break;
-        }
-        take(*best);
+    const auto base = std::find_if(faces.begin(), faces.end(), coversPlainText);
+    if (base != faces.end()) {
+        std::rotate(faces.begin(), base, base + 1);
     }
-    return chosen;
+    return faces;
 }
 
 } // namespace kareport

@@ -43,20 +43,11 @@ KAREPORT_EXPORT std::optional<PdfFace> preferredPdfFace(const QStringList &fontF
 /// The fixed-pitch faces of the system in the order in which they are tried, collections with CJK last.
 KAREPORT_EXPORT std::vector<PdfFace> fixedPitchPdfFaces();
 
-/// A character of a text and how often it occurs there.
-struct CharacterCount
-{
-    char32_t character = 0;
-    qint64 count = 0;
-};
-
-/// The faces that a text is shown with: the one that it is set in comes first, and the others hold what that one lacks.
-/// Only faces that the text needs are among them; none where the system has no face at all.
-/// @param preferred   stands first whatever it covers
-/// @param others      in the order of preference; the first of those that show most of the text stands first otherwise
-/// @param characters  every character of the text once
-KAREPORT_EXPORT std::vector<PdfFace> choosePdfFaces(const std::optional<PdfFace> &preferred,
-                                                    const std::vector<PdfFace> &others,
-                                                    const std::vector<CharacterCount> &characters);
+/// The faces of a PDF: the one that its grid is made of comes first, each of the others shows what those before it lack.
+/// None where the system has no face at all.
+/// @param preferred  stands first whatever it covers
+/// @param others     in the order of preference; the first of them that has all of plain text stands first otherwise
+KAREPORT_EXPORT std::vector<PdfFace> orderPdfFaces(const std::optional<PdfFace> &preferred,
+                                                   const std::vector<PdfFace> &others);
 
 } // namespace kareport

@@ -42,6 +42,7 @@ struct LinePlacement
     float fontSize = 0;      ///< points
     float leading = 0;       ///< points from baseline to baseline
     float firstBaseline = 0; ///< points from the sheet's lower edge
+    qsizetype lines = 0;     ///< that a sheet takes; the others go on the next one
 };
 
 KAREPORT_EXPORT PdfPageBox pdfPageBox(const PdfPageSetup &setup);
@@ -53,10 +54,20 @@ KAREPORT_EXPORT qsizetype linesToFit(const PdfPageSetup &setup, const PdfPageBox
 
 /// Places the lines of a page in its box: as far apart as the face is high or, where the lines that a page has to have
 /// room for do not fit then, as close as they have to be. Lines never run into each other: the font is made smaller where they
-/// would, and a page with more lines than expected, because some had to be broken, is made smaller as a whole.
+/// would, and a page with more lines than expected is made smaller as a whole. Neither gets below `smallestType`; what has no
+/// room then goes on further sheets.
+/// @param fontSize    points
 /// @param linesToFit  lines that every page has room for
-/// @param lines       lines that this page has after breaking
-KAREPORT_EXPORT LinePlacement placeLines(const PdfPageSetup &setup, const PdfPageBox &box, const FaceHeight &face,
+/// @param lines       lines that this page has
+KAREPORT_EXPORT LinePlacement placeLines(double fontSize, const PdfPageBox &box, const FaceHeight &face,
                                          qsizetype linesToFit, qsizetype lines);
+
+/// The cells that stand side by side in a box.
+KAREPORT_EXPORT qint64 cellsAcross(const PdfPageBox &box, int cell, double fontSize);
+
+/// The type size for rows of so many cells: the given one or, where they are wider than the box, the one that they fit it
+/// with, but not below `smallestType`.
+/// @param cell  the advance of a cell, in thousandths of the font size
+KAREPORT_EXPORT double sizeForCells(const PdfPageBox &box, int cell, double fontSize, qint64 cells);
 
 } // namespace kareport

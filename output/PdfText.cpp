@@ -1,9 +1,12 @@
 #include "PdfText.h"
 
+#include "CharacterCells.h"
+
 #include <QChar>
 
-#include <array>
-#include <map>
+#include <algorithm>
+#include <set>
+#include <vector>
 
 namespace kareport
 {
@@ -28,18 +31,50 @@ void removeBlanksAtEnd(QString &line)
     line.truncate(end);
 }
 
-std::vector<CharacterCount> countsOf(const std::vector<qint64> &low, const std::map<char32_t, qint64> &high)
+/// Which characters of the basic plane occur, and the others.
+struct Seen
 {
-    std::vector<CharacterCount> counts;
-    for (std::size_t code = 0; code < low.size(); ++code) {
-        if (low[code] > 0 && !isControl(static_cast<char16_t>(code))) {
-            counts.push_back({static_cast<char32_t>(code), low[code]});
+    std::vector<char> low;
+    std::set<char32_t> high;
+
+    std::u32string visible() const
+    {
+        std::u32string characters;
+        for (std::size_t code = 0; code < low.size(); ++code) {
+            if (low[code] != 0 && !isControl(static_cast<char16_t>(code))) {
+                characters += static_cast<char32_t>(code);
+            }
         }
+        characters.append(high.begin(), high.end());
+        return characters;
     }
-    for (const auto &[code, count] : high) {
-        counts.push_back({code, count});
+};
+
+template <typename Text>
+WideLines findWideLines(const Text &text, const std::u32string &characters, qint64 room)
+{
+    // A line has as many cells as characters at most where no character takes more than one.
+    const bool mayBeWider = text.contains(u'\t') || std::any_of(characters.begin(), characters.end(),
+                                                                [](char32_t c) { return cellsOf(c) > 1; });
+    WideLines found;
+    QString visible;
+    qint64 line = 0;
+    for (qsizetype at = 0; at < text.size();) {
+        const qsizetype feed = text.indexOf(u'\n', at);
+        const qsizetype end = feed < 0 ? text.size() : feed;
+        ++line;
+        if (mayBeWider || end - at > room) {
+            visibleLine(text.sliced(at, end - at), visible);
+            const qint64 cells = cellsOf(visible);
+            if (cells > room) {
+                found.first = found.count == 0 ? line : found.first;
+                found.widest = std::max(found.widest, cells);
+                ++found.count;
+            }
+        }
+        at = end + 1;
     }
-    return counts;
+    return found;
 }
 
 } // namespace
@@ -60,12 +95,13 @@ void visibleLine(QStringView line, QString &visible)
             continue;
         }
         if (character.isHighSurrogate() && i + 1 < line.size() && line[i + 1].isLowSurrogate()) {
+            column += cellsOf(QChar::surrogateToUcs4(character, line[i + 1]));
             visible += character;
             visible += line[++i];
         } else {
             visible += character.isSurrogate() ? QChar(QChar::ReplacementCharacter) : character;
+            column += cellsOf(static_cast<char32_t>(visible.back().unicode()));
         }
-        ++column;
     }
     removeBlanksAtEnd(visible);
 }
@@ -88,30 +124,39 @@ void visibleLine(QLatin1StringView line, QString &visible)
     removeBlanksAtEnd(visible);
 }
 
-std::vector<CharacterCount> visibleCharacters(QStringView text)
+std::u32string visibleCharacters(QStringView text)
 {
-    std::vector<qint64> low(0x10000);
-    std::map<char32_t, qint64> high;
+    Seen seen{std::vector<char>(0x10000), {}};
     for (qsizetype i = 0; i < text.size(); ++i) {
         const QChar character = text[i];
         if (!character.isSurrogate()) {
-            ++low[character.unicode()];
+            seen.low[character.unicode()] = 1;
         } else if (character.isHighSurrogate() && i + 1 < text.size() && text[i + 1].isLowSurrogate()) {
-            ++high[QChar::surrogateToUcs4(character, text[++i])];
+            seen.high.insert(QChar::surrogateToUcs4(character, text[++i]));
         } else {
-            ++low[QChar::ReplacementCharacter];
+            seen.low[QChar::ReplacementCharacter] = 1;
         }
     }
-    return countsOf(low, high);
+    return seen.visible();
 }
 
-std::vector<CharacterCount> visibleCharacters(QLatin1StringView text)
+std::u32string visibleCharacters(QLatin1StringView text)
 {
-    std::vector<qint64> low(0x100);
+    Seen seen{std::vector<char>(0x100), {}};
     for (const char byte : text) {
-        ++low[static_cast<unsigned char>(byte)];
+        seen.low[static_cast<unsigned char>(byte)] = 1;
     }
-    return countsOf(low, {});
+    return seen.visible();
+}
+
+WideLines wideLines(QStringView text, const std::u32string &characters, qint64 room)
+{
+    return findWideLines(text, characters, room);
+}
+
+WideLines wideLines(QLatin1StringView text, const std::u32string &characters, qint64 room)
+{
+    return findWideLines(text, characters, room);
 }
 
 } // namespace kareport

@@ -1,7 +1,8 @@
 #include "PdfTypesetter.h"
 
-#include <hpdf_font.h>
-#include <hpdf_fontdef.h>
+#include "CharacterCells.h"
+#include "PdfLineWriter.h"
+
 #include <hpdf_pages.h>
 #include <hpdf_streams.h>
 
@@ -14,107 +15,89 @@ namespace
 {
 
 constexpr std::size_t planeSize = 0x10000;
-constexpr unsigned char unknownFace = 0xFF;
 /// Strings of a PDF end before 65535 bytes; a character takes four at most.
 constexpr qsizetype longestRun = 16000;
 
-/// Writes a character code of two bytes into a string.
-char *writeCode(char *out, char16_t code)
+/// The grid of a face: the advance of its figures and letters. Where they differ, the widest of them has room.
+int cellOf(const PdfFont &font)
 {
-    for (const int byte : {code >> 8, code & 0xFF}) {
-        switch (byte) {
-        case '(':
-        case ')':
-        case '\\':
-            *out++ = '\\';
-            *out++ = static_cast<char>(byte);
-            break;
-        case '\r': // a bare one would be read as LF
-            *out++ = '\\';
-            *out++ = 'r';
-            break;
-        default: *out++ = static_cast<char>(byte);
+    int cell = 0;
+    for (char16_t character = u' '; character <= u'~'; ++character) {
+        if (font.covers(character)) {
+            cell = std::max(cell, font.advanceOf(character));
         }
     }
-    return out;
+    return cell;
 }
 
 } // namespace
 
-bool PdfTypesetter::loadFaces(PdfDocument &pdf, const std::vector<PdfFace> &faces)
+bool PdfTypesetter::begin(const std::vector<PdfFace> &faces, const std::u32string &characters)
 {
-    for (const PdfFace &face : faces) {
-        const HPDF_Font font = pdf.loadFace(face);
-        if (font == nullptr) {
-            failedFace_ = face.file();
-            return false;
-        }
-        faces_.push_back({face, font, GlyphParts(face)});
+    fonts_ = std::vector<PdfFont>(faces.begin(), faces.end());
+    PdfFont &base = fonts_.front();
+    cell_ = base.embed(pdf_) ? cellOf(base) : 0;
+    if (cell_ == 0) {
+        return false;
     }
-    faceOf_.assign(planeSize, unknownFace);
-    widths_.assign(planeSize, -1);
-    return !faces_.empty();
+    const auto isCovered = [this](char32_t character) {
+        return std::any_of(fonts_.begin(), fonts_.end(),
+                           [character](const PdfFont &font) { return font.covers(character); });
+    };
+    clusters_.begin(pdf_, fonts_, cell_,
+                    isCovered(QChar::ReplacementCharacter) ? char16_t(QChar::ReplacementCharacter) : u'?');
+    coversAll_ = std::all_of(characters.begin(), characters.end(), isCovered);
+    isPlain_.assign(planeSize, false);
+    isAllPlain_ = true;
+    for (const char32_t character : characters + U' ') { // tabs become blanks
+        const auto code = static_cast<char16_t>(character);
+        const bool isPlain = base.covers(character) && cellsOf(character) == 1 && base.advanceOf(code) == cell_;
+        if (isPlain) {
+            base.show(code);
+            isPlain_[code] = true;
+        }
+        isAllPlain_ = isAllPlain_ && isPlain;
+    }
+    return true;
+}
+
+QString PdfTypesetter::failedFace() const
+{
+    if (!fonts_.empty() && !fonts_.front().isEmbedded()) {
+        return fonts_.front().face().file();
+    }
+    return clusters_.failedFace() ? clusters_.failedFace()->file() : QString();
 }
 
 FaceHeight PdfTypesetter::height() const
 {
-    const HPDF_Box box = HPDF_Font_GetBBox(faces_.front().font);
+    const HPDF_Box box = HPDF_Font_GetBBox(fonts_.front().handle());
     return {box.top, box.bottom};
 }
 
-bool PdfTypesetter::covers(char32_t character) const
+void PdfTypesetter::findMissing(QStringView line, const std::function<void(char32_t)> &isMissing)
 {
-    return std::any_of(faces_.begin(), faces_.end(),
-                       [character](const Entry &entry) { return entry.face.covers(character); });
-}
-
-std::size_t PdfTypesetter::faceOf(char16_t character)
-{
-    unsigned char &face = faceOf_[character];
-    if (face == unknownFace) {
-        const auto found = std::find_if(faces_.begin(), faces_.end(),
-                                        [character](const Entry &entry) { return entry.face.covers(character); });
-        // What nobody has is left to the first face, which has a sign for it.
-        face = static_cast<unsigned char>(found != faces_.end() ? found - faces_.begin() : 0);
+    if (isPlain(line)) {
+        return;
     }
-    return face;
-}
-
-int PdfTypesetter::width(char32_t character)
-{
-    short &width = widths_[character & 0xFFFF];
-    if (width < 0) {
-        const auto code = static_cast<char16_t>(character);
-        const Entry &entry = faces_[faceOf(code)];
-        width = static_cast<short>(std::max(0, HPDF_Font_GetUnicodeWidth(entry.font, code)));
-        embedParts(entry, code);
-    }
-    return width;
-}
-
-void PdfTypesetter::embedParts(const Entry &entry, char16_t character)
-{
-    // The library embeds the parts of a glyph, but not the parts of the parts, and none beyond the 32767th glyph: the
-    // Greek epsilon or a Hangul syllable would stay blank.
-    const auto *font = static_cast<HPDF_FontAttr>(entry.font->attr);
-    const auto *face = static_cast<HPDF_TTFontDefAttr>(font->fontdef->attr);
-    for (const unsigned part : entry.parts.of(HPDF_TTFontDef_GetGlyphid(font->fontdef, character))) {
-        if (part < face->num_glyphs) {
-            face->glyph_tbl.flgs[part] = 1;
+    for (qsizetype at = 0; at < line.size();) {
+        const qsizetype end = clusterEnd(line, at);
+        for (const char32_t character : clusters_.of(line.sliced(at, end - at)).missing) {
+            isMissing(character);
         }
+        at = end;
     }
 }
 
-bool PdfTypesetter::addPage(PdfDocument &pdf, const PdfPageBox &box, const LinePlacement &placement,
-                            const std::vector<QStringView> &lines)
+bool PdfTypesetter::addPage(const PdfPageBox &box, const LinePlacement &placement, std::span<const QStringView> lines)
 {
-    const HPDF_Page page = pdf.addPage();
+    const HPDF_Page page = pdf_.addPage();
     if (page == nullptr) {
         return false;
     }
     HPDF_Page_SetWidth(page, box.width);
     HPDF_Page_SetHeight(page, box.height);
-    HPDF_Page_SetFontAndSize(page, faces_.front().font, placement.fontSize);
+    HPDF_Page_SetFontAndSize(page, fonts_.front().handle(), placement.fontSize);
     HPDF_Page_BeginText(page);
     HPDF_Page_SetTextLeading(page, placement.leading);
     // Every line begins by moving down to it, the first one as well.
@@ -122,50 +105,86 @@ bool PdfTypesetter::addPage(PdfDocument &pdf, const PdfPageBox &box, const LineP
     for (const QStringView line : lines) {
         if (line.isEmpty()) {
             operators_ += "T*\n";
+        } else if (isPlain(line)) {
+            addPlain(line);
         } else {
-            showLine(page, placement.fontSize, line);
+            addCells(page, double(placement.fontSize), line);
         }
     }
     writeOut(page);
     HPDF_Page_EndText(page);
-    return pdf.isGood() && !failed_;
+    return pdf_.isGood() && !failed_ && failedFace().isEmpty();
 }
 
-void PdfTypesetter::showLine(HPDF_Page page, float fontSize, QStringView line)
+bool PdfTypesetter::finish()
 {
-    qsizetype begin = 0;
-    while (begin < line.size()) {
-        const std::size_t face = faces_.size() > 1 ? faceOf(line[begin].unicode()) : 0;
-        qsizetype end = std::min(line.size(), begin + longestRun);
-        if (faces_.size() > 1) {
-            const auto isOther = [&](QChar character) { return faceOf(character.unicode()) != face; };
-            end = std::find_if(line.begin() + begin, line.begin() + end, isOther) - line.begin();
-        }
-        if (face != 0) {
-            writeOut(page);
-            HPDF_Page_SetFontAndSize(page, faces_[face].font, fontSize);
-        }
-        addRun(line.sliced(begin, end - begin), begin == 0);
-        if (face != 0) {
-            writeOut(page);
-            HPDF_Page_SetFontAndSize(page, faces_.front().font, fontSize);
-        }
-        begin = end;
+    return std::all_of(fonts_.begin(), fonts_.end(),
+                       [](PdfFont &font) { return !font.isEmbedded() || font.describeCharacters(); });
+}
+
+bool PdfTypesetter::isPlain(QStringView line) const
+{
+    return isAllPlain_ ||
+           std::all_of(line.begin(), line.end(), [this](QChar character) { return isPlain_[character.unicode()]; });
+}
+
+void PdfTypesetter::addPlain(QStringView line)
+{
+    for (qsizetype begin = 0; begin < line.size(); begin += longestRun) {
+        addPdfString(operators_, line.sliced(begin, std::min(longestRun, line.size() - begin)));
+        operators_ += begin == 0 ? "'\n" : "Tj\n";
     }
 }
 
-void PdfTypesetter::addRun(QStringView run, bool onNextLine)
+void PdfTypesetter::addCells(HPDF_Page page, double fontSize, QStringView line)
 {
-    const qsizetype size = operators_.size();
-    operators_.resize(size + 4 * run.size() + 8);
-    char *const begin = operators_.data();
-    char *out = begin + size;
-    *out++ = '(';
-    for (const QChar character : run) {
-        out = writeCode(out, character.unicode());
+    operators_ += "T*\n";
+    const auto nameOf = [this, page](std::size_t font) {
+        return HPDF_Page_GetLocalFontName(page, fonts_[font].handle());
+    };
+    PdfLineWriter writer(operators_, nameOf, fontSize);
+    double left = 0;
+    for (qsizetype at = 0; at < line.size();) {
+        at = collectWord(line, at);
+        const bool isSpelledOut =
+            std::all_of(word_.begin(), word_.end(), [](const PdfCluster *cluster) { return cluster->isSpelledOut; });
+        if (!isSpelledOut) {
+            QString text;
+            for (const PdfCluster *cluster : word_) {
+                text += cluster->text;
+            }
+            writer.beginText(text);
+        }
+        for (const PdfCluster *cluster : word_) {
+            for (const PdfGlyph &glyph : cluster->glyphs) {
+                writer.show(glyph.font, glyph.code, left + glyph.left, glyph.rise, glyph.stretch, glyph.advance);
+            }
+            left += cluster->cells * double(cell_);
+        }
+        if (!isSpelledOut) {
+            writer.endText();
+        }
     }
-    operators_.truncate(out - begin);
-    operators_ += onNextLine ? ")'\n" : ")Tj\n";
+    writer.end();
+}
+
+qsizetype PdfTypesetter::collectWord(QStringView line, qsizetype begin)
+{
+    word_.clear();
+    qsizetype at = begin;
+    while (at < line.size()) {
+        const qsizetype end = clusterEnd(line, at);
+        const QStringView cluster = line.sliced(at, end - at);
+        if (cluster == u" " && !word_.empty()) {
+            break;
+        }
+        word_.push_back(&clusters_.of(cluster));
+        at = end;
+        if (cluster == u" ") {
+            break;
+        }
+    }
+    return at;
 }
 
 void PdfTypesetter::writeOut(HPDF_Page page)

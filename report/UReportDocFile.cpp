@@ -5,6 +5,7 @@
 #include "Folders.h"
 #include "LineEndings.h"
 #include "MemoryLasts.h"
+#include "PageHeader.h"
 #include "PdfExport.h"
 #include "ReplaceFile.h"
 #include "ReportContent.h"
@@ -178,13 +179,13 @@ bool UReportDoc::writeAsPdf(QIODevice &device, kareport::PdfNotes *notes,
 {
     kareport::PdfOptions options;
     options.page = {geometry_.pageSize, geometry_.resolution, margins_, fontSize_, GetLinesPerPage()};
-    options.lineCount = GetLineCount();
+    options.pageStarts = GetPageStarts();
     options.progress = progress;
     const kareport::ReportText &text = page_.text();
     if (HoldsRichTextSource()) {
         // The text of the document, not its source.
         const QString shown = kareport::shownPlainText(*this);
-        options.lineCount = static_cast<int>(shown.count(u'\n')) + 1;
+        options.pageStarts = kareport::pageHeadersIn(shown);
         return kareport::writePdf(device, QStringView(shown), options, notes);
     }
     return text.isNarrow() ? kareport::writePdf(device, text.narrowView(), options, notes)

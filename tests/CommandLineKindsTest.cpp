@@ -65,6 +65,41 @@ TEST(CommandLineKinds, ACharacterThatNoFontHasIsSaid)
     EXPECT_EQ(folder.run("render e.json -o e.pdf --quiet").err, "");
 }
 
+TEST(CommandLineKinds, AnEmptyReportMakesNoPdf)
+{
+    const CommandLineFolder folder;
+    folder.put("e.json", R"({"report": [], "output": ["e.pdf", "e.txt"]})");
+    folder.put("e.pdf", "kept");
+    const std::string said = "kareport: the report is empty, and a PDF has a page at least: \"" +
+                             folder.path("e.pdf").toStdString() + "\" was not written\n";
+    const ProgramRun run = folder.run("render e.json");
+    EXPECT_EQ(run.status, 2);
+    EXPECT_EQ(run.err.toStdString(), said);
+    EXPECT_EQ(folder.bytesOf("e.pdf"), "kept");
+    EXPECT_TRUE(QFile::exists(folder.path("e.txt"))) << "the other outputs are written";
+    EXPECT_EQ(folder.run("render e.json --quiet").err.toStdString(), said) << "it is an error";
+    folder.put("e.rep", "");
+    const ProgramRun converted = folder.run("convert e.rep e.pdf");
+    EXPECT_EQ(converted.status, 2) << converted.all().constData();
+    EXPECT_EQ(folder.bytesOf("e.pdf"), "kept");
+    const ProgramRun piped = folder.run("convert e.rep - --as pdf");
+    EXPECT_EQ(piped.status, 2);
+    EXPECT_EQ(piped.out, QByteArray());
+    folder.put("blank.txt", "\r\n");
+    ASSERT_EQ(folder.run("convert blank.txt e.pdf").status, 0) << "a blank line is a line";
+    EXPECT_EQ(PdfReadBack(folder.bytesOf("e.pdf")).pageCount(), 1);
+}
+
+TEST(CommandLineKinds, AWideLineIsSaid)
+{
+    const CommandLineFolder folder;
+    folder.put("w.txt", "narrow\n" + QByteArray(150, 'x') + "\n");
+    const ProgramRun run = folder.run("convert w.txt w.pdf --set page.linesPerPage=72 --set page.paper=A4");
+    EXPECT_EQ(run.status, 0);
+    EXPECT_TRUE(run.err.startsWith("kareport: warning: \"w.pdf\": line 2 is wider than the page: the type is "))
+        << run.err.constData();
+}
+
 TEST(CommandLineKinds, APdfGoesToStandardOutputAsWell)
 {
     const CommandLineFolder folder;

@@ -43,42 +43,43 @@ Reach reachOf(const PdfFace &face)
     return {double(box.top) / 1000 * fontSize * dotsPerPoint, -double(box.bottom) / 1000 * fontSize * dotsPerPoint};
 }
 
-struct Drawing
-{
-    const char *family;
-    const char *file; ///< how its name ends
-    QStringList lines;
-    const char *reason;
-};
+/// The cell of DejaVu Sans Mono.
+constexpr double cell = 0.602 * fontSize * dotsPerPoint;
 
-PdfFace faceOf(const Drawing &drawing)
+PdfFace baseFace()
 {
-    for (const PdfFace &face : kareport::fixedPitchPdfFaces()) {
-        if (face.file().endsWith(QString::fromUtf8(drawing.file))) {
-            return face;
-        }
-    }
-    ADD_FAILURE() << "no face " << drawing.family;
-    return {dejaVuFile(), 0, false};
+    return kareport::fixedPitchPdfFaces().front();
 }
 
-/// The same page drawn character by character.
-QImage drawn(const Drawing &drawing, const QSize &size, const Reach &reach)
+QFont fontOf(const char *family)
 {
-    QFont font(QString::fromUtf8(drawing.family));
+    QFont font(QString::fromUtf8(family));
     font.setPixelSize(fontSize * dotsPerInch / 72);
     font.setHintingPreference(QFont::PreferNoHinting);
-    EXPECT_TRUE(QFontInfo(font).family().startsWith(QString::fromUtf8(drawing.family)));
+    EXPECT_TRUE(QFontInfo(font).family().startsWith(QString::fromUtf8(family)));
+    return font;
+}
+
+/// The same page drawn character by character: in cells of DejaVu Sans Mono, and CJK of another face across two of them.
+QImage drawn(const QStringList &lines, const QSize &size, const Reach &reach)
+{
+    const QFont base = fontOf("DejaVu Sans Mono");
+    const QFont wide = fontOf("WenQuanYi Zen Hei Mono");
     QImage image(size, QImage::Format_Grayscale8);
     image.fill(Qt::white);
     QPainter painter(&image);
-    painter.setFont(font);
     double baseline = margin + reach.above;
-    for (const QString &line : drawing.lines) {
+    for (const QString &line : lines) {
         double x = margin;
         for (const QChar character : line) {
-            painter.drawText(QPointF(x, baseline), QString(character));
-            x += QFontMetricsF(font).horizontalAdvance(character);
+            const bool isWide = character.unicode() >= 0x2E80;
+            painter.setFont(isWide ? wide : base);
+            painter.save();
+            painter.translate(x, baseline);
+            painter.scale(isWide ? 2 * 0.602 : 1, 1);
+            painter.drawText(QPointF(), QString(character));
+            painter.restore();
+            x += isWide ? 2 * cell : cell;
         }
         baseline += reach.above + reach.below;
     }
@@ -87,26 +88,27 @@ QImage drawn(const Drawing &drawing, const QSize &size, const Reach &reach)
 
 TEST(PdfExportPicture, LinesLookAsTheirFaceDrawsThem)
 {
+    struct Drawing
+    {
+        QStringList lines;
+        const char *reason;
+    };
     const Drawing drawings[] = {
-        {"DejaVu Sans Mono",
-         "DejaVuSansMono.ttf",
-         {QStringLiteral("Traverse of 12 points (closed)"), QStringLiteral("| 0123456789.500 | -0.004 |"),
+        {{QStringLiteral("Traverse of 12 points (closed)"), QStringLiteral("| 0123456789.500 | -0.004 |"),
           QStringLiteral("é à ü ñ Å Ç õ"), QStringLiteral("° ½ ß µ ± ²"), QStringLiteral("∞ ≤ Ω α Δ √"),
           QStringLiteral("é"), QStringLiteral("\u012A \u0159 \u1E03"), QStringLiteral("gjpqy ,;_")},
          "letters, letters made of others, signs"},
-        {"WenQuanYi Zen Hei Mono",
-         "wqy-zenhei.ttc",
-         {QStringLiteral("測量報告 座標"), QStringLiteral("é ∞ 測 A 量 1"), QStringLiteral("かな カナ"),
-          QStringLiteral("。、「」"), QStringLiteral("한글 측량")},
+        {{QStringLiteral("測量報告 座標"), QStringLiteral("é ∞ 測 A 量 1"), QStringLiteral("かな カナ"),
+          QStringLiteral("。、「」"), QStringLiteral("한글 측량"), QStringLiteral("│測│1│")},
          "CJK among others"},
     };
+    const Reach reach = reachOf(baseFace());
     for (const Drawing &drawing : drawings) {
-        const Reach reach = reachOf(faceOf(drawing));
-        PdfOptions options = pdfOptions(drawing.lines.size());
+        PdfOptions options = pdfOptions();
         options.page.fontSize = fontSize;
         options.page.linesPerPage = 20;
         const QImage shown = PdfReadBack(pdfBytes(drawing.lines.join(u'\n'), options)).picture(1, dotsPerInch);
-        const QImage expected = drawn(drawing, shown.size(), reach);
+        const QImage expected = drawn(drawing.lines, shown.size(), reach);
         for (qsizetype i = 0; i < drawing.lines.size(); ++i) {
             const double top = margin + static_cast<double>(i) * (reach.above + reach.below);
             const QRect area(0, qRound(top), shown.width(), qRound(reach.above + reach.below) - 2);
@@ -126,8 +128,7 @@ TEST(PdfExportPicture, LinesLookAsTheirFaceDrawsThem)
 TEST(PdfExportPicture, EveryLetterHasAllItsParts)
 {
     // Letters that are made of others are where an embedded face may lose something.
-    Drawing drawing{"DejaVu Sans Mono", "DejaVuSansMono.ttf", {}, ""};
-    const PdfFace face = faceOf(drawing);
+    const PdfFace face = baseFace();
     constexpr std::pair<char16_t, char16_t> ranges[] = {
         {0x00A1, 0x024F}, {0x0386, 0x03FF}, {0x0400, 0x052F}, {0x1E00, 0x1EFF}, {0x1F00, 0x1FFE}, {0x2010, 0x22FF},
     };
@@ -143,22 +144,22 @@ TEST(PdfExportPicture, EveryLetterHasAllItsParts)
         }
     }
     ASSERT_GT(letters.size(), 1200);
+    QStringList lines;
     for (qsizetype i = 0; i < letters.size(); i += lettersPerLine) {
-        drawing.lines.append(letters.mid(i, lettersPerLine));
+        lines.append(letters.mid(i, lettersPerLine));
     }
-    PdfOptions options = pdfOptions(drawing.lines.size());
+    PdfOptions options = pdfOptions();
     options.page.pageSize = QSize(4961, 20000);
     options.page.fontSize = fontSize;
     const Reach reach = reachOf(face);
-    const QImage shown = PdfReadBack(pdfBytes(drawing.lines.join(u'\n'), options)).picture(1, dotsPerInch);
-    const QImage expected = drawn(drawing, shown.size(), reach);
-    const double width = 0.602 * fontSize * dotsPerPoint;
+    const QImage shown = PdfReadBack(pdfBytes(lines.join(u'\n'), options)).picture(1, dotsPerInch);
+    const QImage expected = drawn(lines, shown.size(), reach);
     for (qsizetype i = 0; i < letters.size(); ++i) {
-        const double left = margin + static_cast<double>(i % lettersPerLine) * width;
+        const double left = margin + static_cast<double>(i % lettersPerLine) * cell;
         const double top = margin + static_cast<double>(i / lettersPerLine) * (reach.above + reach.below);
-        const QRect cell(qRound(left), qRound(top), qRound(width), qRound(reach.above + reach.below));
-        const double amount = inkIn(shown, cell).amount;
-        const double expectedAmount = inkIn(expected, cell).amount;
+        const QRect area(qRound(left), qRound(top), qRound(cell), qRound(reach.above + reach.below));
+        const double amount = inkIn(shown, area).amount;
+        const double expectedAmount = inkIn(expected, area).amount;
         EXPECT_NEAR(amount, expectedAmount, 6 + expectedAmount / 10)
             << "U+" << QString::number(letters[i].unicode(), 16).toStdString();
     }
@@ -168,9 +169,9 @@ TEST(PdfExportPicture, NoInkStandsOutsideTheBox)
 {
     QString text;
     for (int line = 1; line <= 144; ++line) {
-        text += QString(line % 7 == 0 ? 120 : 90, QChar(u'É')) + QStringLiteral(" gjy\r\n");
+        text += QString(line % 7 == 0 ? 104 : 90, QChar(u'É')) + QStringLiteral(" gjy\r\n");
     }
-    PdfOptions options = pdfOptions(144);
+    PdfOptions options = pdfOptions();
     options.page.fontSize = 8;
     options.page.linesPerPage = 72;
     const PdfReadBack pdf(pdfBytes(text, options));

@@ -22,31 +22,22 @@ TEST(PdfExportText, LinesStandOnTheirPages)
     struct Row
     {
         QString text;
-        qint64 lineCount;
         QStringList expected;
         const char *reason;
     };
     const QString sixty = QStringLiteral("line\r\n").repeated(59) + QStringLiteral("last of 60\r\n");
     const auto full = [](const char *last) { return QStringLiteral("line\n").repeated(59) + QString::fromUtf8(last); };
     const Row rows[] = {
-        {QStringLiteral("A\r\n"), 1, {QStringLiteral("A")}, "one line"},
-        {QStringLiteral("A"), 1, {QStringLiteral("A")}, "without its end"},
-        {sixty, 60, {full("last of 60")}, "the last line of a full page is there"},
-        {sixty + QStringLiteral("61st\r\n"), 61, {full("last of 60"), QStringLiteral("61st")}, "one line more"},
-        {sixty + sixty, 120, {full("last of 60"), full("last of 60")}, "two full pages"},
-        {sixty + QStringLiteral("61st\r\n"),
-         1,
-         {full("last of 60"), QStringLiteral("61st")},
-         "an edited text with more lines than were counted"},
-        {QStringLiteral("A\r\n"),
-         121,
-         {QStringLiteral("A"), QString(), QString()},
-         "an edited text with fewer lines: the blank pages stay"},
-        {QString(), 61, {QString(), QString()}, "nothing is left of it"},
-        {QString(60, u'\n'), 60, {QString()}, "empty lines alone"},
+        {QStringLiteral("A\r\n"), {QStringLiteral("A")}, "one line"},
+        {QStringLiteral("A"), {QStringLiteral("A")}, "without its end"},
+        {sixty, {full("last of 60")}, "the last line of a full page is there"},
+        {sixty + QStringLiteral("61st\r\n"), {full("last of 60"), QStringLiteral("61st")}, "one line more"},
+        {sixty + sixty, {full("last of 60"), full("last of 60")}, "two full pages"},
+        {sixty + QString(200, u'\n'), {full("last of 60")}, "blank lines at the end make no page"},
+        {QString(60, u'\n'), {QString()}, "empty lines alone"},
     };
     for (const Row &row : rows) {
-        const PdfReadBack pdf(pdfBytes(row.text, pdfOptions(row.lineCount)));
+        const PdfReadBack pdf(pdfBytes(row.text, pdfOptions()));
         EXPECT_EQ(pdf.columns(characterWidth), row.expected) << row.reason;
         EXPECT_EQ(pdf.pageCount(), row.expected.size()) << row.reason;
         EXPECT_EQ(pdf.check(), QString()) << row.reason;
@@ -55,7 +46,7 @@ TEST(PdfExportText, LinesStandOnTheirPages)
 
 TEST(PdfExportText, AReportWithoutLinesHasNoPage)
 {
-    const QByteArray bytes = pdfBytes(u"", pdfOptions(0));
+    const QByteArray bytes = pdfBytes(u"", pdfOptions());
     EXPECT_TRUE(bytes.startsWith("%PDF-"));
     EXPECT_TRUE(bytes.trimmed().endsWith("%%EOF"));
     EXPECT_TRUE(bytes.contains("/Count 0")) << "the library writes it as it stands";
@@ -88,7 +79,7 @@ TEST(PdfExportText, IsWhatIsSeenOfTheReport)
     for (const Row &row : rows) {
         PdfNotes notes;
         const PdfReadBack pdf(
-            pdfBytes(QString(row.line.toString() + QStringLiteral("\r\nnext\r\n")), pdfOptions(2), &notes));
+            pdfBytes(QString(row.line.toString() + QStringLiteral("\r\nnext\r\n")), pdfOptions(), &notes));
         EXPECT_EQ(pdf.pages(), QStringList{row.expected.toString() + QStringLiteral("\nnext")}) << row.reason;
         EXPECT_EQ(pdf.check(), QString()) << row.reason;
         EXPECT_EQ(notes.warnings(), QStringList()) << row.reason;
@@ -105,8 +96,8 @@ TEST(PdfExportText, TabsLeadToEveryEighthColumn)
 
 TEST(PdfExportText, AWideLineGoesOnBelow)
 {
-    // There are 523.32 points of room: 96 characters.
-    const std::u16string x96(96, u'x');
+    // There are 523.32 points of room: 173 characters of 5 points, which get no smaller.
+    const std::u16string x173(173, u'x');
     struct Row
     {
         std::u16string line;
@@ -114,20 +105,21 @@ TEST(PdfExportText, AWideLineGoesOnBelow)
         const char *reason;
     };
     const Row rows[] = {
-        {x96, x96, "fills the box"},
-        {x96 + u"y", x96 + u"\ny", "a word that is wider than the box is broken at its edge"},
-        {x96 + x96 + u"y z", x96 + u"\n" + x96 + u"\ny z", "and goes on"},
-        {x96 + u" y", x96 + u"\ny", "a blank that crosses the edge is the break"},
-        {x96.substr(1) + u" y", x96.substr(1) + u"\ny", "a blank in the last place is the break"},
-        {u"ab " + x96, u"ab\n" + x96, "a word that does not fit goes below"},
-        {u"ab " + x96 + u"y", u"ab\n" + x96 + u"\ny", "also one that is broken there"},
-        {x96 + std::u16string(40, u' '), x96, "blanks beyond the edge need no line"},
+        {x173, x173, "fills the box"},
+        {x173 + u"y", x173 + u"\ny", "a word that is wider than the box is broken at its edge"},
+        {x173 + x173 + u"y z", x173 + u"\n" + x173 + u"\ny z", "and goes on"},
+        {x173 + u" y", x173 + u"\ny", "a blank that crosses the edge is the break"},
+        {x173.substr(1) + u" y", x173.substr(1) + u"\ny", "a blank in the last place is the break"},
+        {u"ab " + x173, u"ab\n" + x173, "a word that does not fit goes below"},
+        {u"ab " + x173 + u"y", u"ab\n" + x173 + u"\ny", "also one that is broken there"},
+        {x173 + std::u16string(40, u' '), x173, "blanks beyond the edge need no line"},
     };
     for (const Row &row : rows) {
         const std::u16string text = row.line + u"\r\nnext\r\n";
-        const PdfReadBack pdf(pdfBytes(QStringView(text), pdfOptions(2)));
-        EXPECT_EQ(pdf.columns(characterWidth), QStringList{QString::fromStdU16String(row.expected + u"\nnext")})
-            << row.reason;
+        PdfOptions options = pdfOptions();
+        options.page.fontSize = 5;
+        const PdfReadBack pdf(pdfBytes(QStringView(text), options));
+        EXPECT_EQ(pdf.columns(3.01), QStringList{QString::fromStdU16String(row.expected + u"\nnext")}) << row.reason;
     }
 }
 
@@ -140,7 +132,7 @@ TEST(PdfExportText, EmptyLinesTakeTheirRoom)
         const char *reason;
     };
     const QString blanks(200, u' ');
-    const QString tabs = QString(12, u'\t') + u'x';
+    const QString tabs = QString(21, u'\t') + QString(6, u' ') + u'x';
     const Row rows[] = {
         {u"", 1, "none"},
         {u"\r\n", 2, "one"},
@@ -162,7 +154,7 @@ TEST(PdfExportText, EmptyLinesTakeTheirRoom)
             .words();
     ASSERT_EQ(words.size(), 4U);
     const double step = (words[1].top - words[0].top) / 2;
-    EXPECT_NEAR(words[2].top - words[1].top, 2 * step, 0.01) << "tabs up to the edge, the word below it";
+    EXPECT_NEAR(words[2].top - words[1].top, 2 * step, 0.01) << "tabs up to the edge at 5 points, the word below it";
     EXPECT_NEAR(words[3].top - words[2].top, step, 0.01);
     EXPECT_NEAR(words[2].left, 36, 0.01);
 }
@@ -173,8 +165,8 @@ TEST(PdfExportText, AFullPageOfBrokenLinesLosesNone)
     for (int line = 1; line <= 61; ++line) {
         text += QStringLiteral("%1 %2\r\n").arg(QString(250, QChar(u'a' + line % 26))).arg(line);
     }
-    const PdfReadBack pdf(pdfBytes(text, pdfOptions(61)));
-    EXPECT_EQ(pdf.pageCount(), 2);
+    const PdfReadBack pdf(pdfBytes(text, pdfOptions()));
+    EXPECT_EQ(pdf.pageCount(), 3) << "120 lines of 5 points take two sheets, and one line another page";
     EXPECT_EQ(pdf.characters(), QString(text).remove(u' ').remove(u'\r').remove(u'\n'));
     for (const PdfWord &word : pdf.words()) {
         EXPECT_GE(word.left, 35.9) << word.text.toStdString();
@@ -204,7 +196,7 @@ TEST(PdfExportText, APageMayHoldMoreThanALibraryCallTakes)
     };
     for (const Row &row : rows) {
         // A huge sheet: on a usual one the text gets so small that it is not read back.
-        PdfOptions options = pdfOptions(2);
+        PdfOptions options = pdfOptions();
         options.page.pageSize = QSize(14000, 14000);
         options.page.resolution = 72;
         options.page.margins = QMargins();
@@ -220,7 +212,7 @@ TEST(PdfExportText, ACharacterThatNoFaceHasIsReported)
 {
     PdfNotes notes;
     const QString text = pdfLines(QStringLiteral("A\n😀 B 😀😀\n𝔸 C\n😀\n"));
-    const PdfReadBack pdf(pdfBytes(text, pdfOptions(4), &notes));
+    const PdfReadBack pdf(pdfBytes(text, pdfOptions(), &notes));
     EXPECT_EQ(pdf.pages(), QStringList{QStringLiteral("A\n\uFFFD B \uFFFD\uFFFD\n\uFFFD C\n\uFFFD")});
     ASSERT_EQ(notes.missing.size(), 2U);
     EXPECT_EQ(notes.missing[0].character, U'😀');
@@ -241,7 +233,7 @@ TEST(PdfExportText, TheLineOfAMissingCharacterIsCountedOverAllPages)
 {
     PdfNotes notes;
     const QString text = QStringLiteral("line\r\n").repeated(130) + QStringLiteral("😀\r\n");
-    pdfBytes(text, pdfOptions(131), &notes);
+    pdfBytes(text, pdfOptions(), &notes);
     ASSERT_EQ(notes.missing.size(), 1U);
     EXPECT_EQ(notes.missing[0].firstLine, 131);
 }
@@ -251,7 +243,7 @@ TEST(PdfExportText, OneByteAndTwoByteTextsGiveTheSameFile)
     std::string bytes = "Tab\tb\r\nlone\rCR\r\n\x85\x7F\xA0\xE9\xB0\xFF trailing   \r\n";
     bytes += std::string(300, 'x') + "\r\nlast";
     for (const std::string &text : {bytes, std::string(), std::string("\r\n")}) {
-        const PdfOptions options = pdfOptions(5);
+        const PdfOptions options = pdfOptions();
         QBuffer buffer;
         buffer.open(QIODevice::WriteOnly);
         const QLatin1StringView narrow(text.data(), static_cast<qsizetype>(text.size()));

@@ -5,8 +5,6 @@
 namespace
 {
 
-using kareport::CharacterCount;
-using kareport::choosePdfFaces;
 using kareport::PdfFace;
 using kareport::preferredPdfFace;
 
@@ -118,60 +116,37 @@ TEST(PdfFaces, TheSystemsOwnAreInTheOrderOfPreference)
     EXPECT_FALSE(kareport::systemFontFolders().isEmpty());
 }
 
-std::vector<CharacterCount> countsOf(const char32_t *characters)
-{
-    std::vector<CharacterCount> counts;
-    for (; *characters != 0; ++characters) {
-        counts.push_back({*characters, 1});
-    }
-    return counts;
-}
-
-TEST(PdfFaces, TheFirstThatShowsMostIsTaken)
+TEST(PdfFaces, TheFirstThatHasPlainTextStandsFirst)
 {
     const PdfFace deja = dejaVu();
     const PdfFace wqy = zenHei();
     FontFolder folder;
     folder.withText(QStringLiteral("bad.ttf"), "no font");
     const PdfFace bad(QDir(folder.path()).filePath(QStringLiteral("bad.ttf")), 0, false);
-    const auto filesOf = [](const std::vector<PdfFace> &faces) {
-        QStringList files;
-        for (const PdfFace &face : faces) {
-            files.append(face.file().section(u'/', -1).section(u'.', 0, 0));
-        }
-        return files.join(u' ');
-    };
     struct Row
     {
         std::optional<PdfFace> preferred;
         std::vector<PdfFace> others;
-        const char32_t *characters;
         QStringView expected;
         const char *reason;
     };
     const Row rows[] = {
-        {{}, {}, U"A", u"", "no face at all"},
-        {{}, {deja, wqy}, U"", u"DejaVuSansMono", "nothing is written: the first"},
-        {{}, {deja, wqy}, U"Aé", u"DejaVuSansMono", "both have all: the first"},
-        {{}, {wqy, deja}, U"Aé", u"wqy-zenhei", "both have all: the first"},
-        {{}, {deja, wqy}, U"A測", u"wqy-zenhei", "the one that has all"},
-        {{}, {deja, wqy}, U"A⧫測量", u"wqy-zenhei DejaVuSansMono", "the second has what the first lacks"},
-        {{}, {deja, wqy}, U"A⧫⦇測", u"DejaVuSansMono wqy-zenhei", "the one that has most stands first"},
-        {{}, {deja, wqy}, U"A😀", u"DejaVuSansMono", "what nobody has calls for nobody"},
-        {{}, {deja, wqy}, U"😀", u"DejaVuSansMono", "what nobody has still needs a face for its sign"},
-        {deja, {deja, wqy}, U"A", u"DejaVuSansMono", "the preferred one has all"},
-        {deja, {deja, wqy}, U"A測", u"DejaVuSansMono wqy-zenhei", "it stands first, the others help out"},
-        {deja, {}, U"A測", u"DejaVuSansMono", "nobody helps out"},
-        {wqy, {deja, wqy}, U"Aé", u"wqy-zenhei", "it stands first for pure ASCII, too"},
-        {wqy, {deja, wqy}, U"", u"wqy-zenhei", "nothing is written"},
-        {bad, {deja, wqy}, U"A", u"bad DejaVuSansMono", "it stands first whatever it covers"},
+        {{}, {}, u"", "no face at all"},
+        {{}, {deja, wqy}, u"DejaVuSansMono wqy-zenhei", "both have plain text: as they are"},
+        {{}, {wqy, deja}, u"wqy-zenhei DejaVuSansMono", "both have plain text: as they are"},
+        {{}, {bad, wqy, deja}, u"wqy-zenhei bad DejaVuSansMono", "what has no letters makes no grid"},
+        {{}, {bad}, u"bad", "nobody has plain text: as they are"},
+        {wqy, {deja, wqy}, u"wqy-zenhei DejaVuSansMono wqy-zenhei", "the preferred one before all"},
+        {bad, {deja, wqy}, u"bad DejaVuSansMono wqy-zenhei", "it stands first whatever it covers"},
+        {deja, {}, u"DejaVuSansMono", "nobody helps out"},
     };
     for (const Row &row : rows) {
-        EXPECT_EQ(filesOf(choosePdfFaces(row.preferred, row.others, countsOf(row.characters))), row.expected)
-            << row.reason;
+        QStringList files;
+        for (const PdfFace &face : kareport::orderPdfFaces(row.preferred, row.others)) {
+            files.append(face.file().section(u'/', -1).section(u'.', 0, 0));
+        }
+        EXPECT_EQ(files.join(u' '), row.expected) << row.reason;
     }
-    EXPECT_EQ(filesOf(choosePdfFaces({}, {deja, wqy}, {{U'⧫', 1}, {U'測', 2}})), u"wqy-zenhei DejaVuSansMono")
-        << "occurrences count, not characters";
 }
 
 } // namespace

@@ -53,7 +53,7 @@ private:
 };
 
 /// A4 at 600 dpi with margins of half an inch, 60 lines of 9 points a page, and no preferred face.
-inline kareport::PdfOptions pdfOptions(qint64 lineCount)
+inline kareport::PdfOptions pdfOptions()
 {
     kareport::PdfOptions options;
     options.page.pageSize = QSize(4961, 7016);
@@ -61,7 +61,6 @@ inline kareport::PdfOptions pdfOptions(qint64 lineCount)
     options.page.margins = QMargins(1270, 1270, 1270, 1270);
     options.page.fontSize = 9;
     options.page.linesPerPage = 60;
-    options.lineCount = lineCount;
     options.fontFolders = QStringList();
     return options;
 }
@@ -85,5 +84,5 @@ inline QByteArray pdfBytes(QStringView text, const kareport::PdfOptions &options
 
 inline QByteArray pdfBytes(const QString &text)
 {
-    return pdfBytes(text, pdfOptions(text.count(u'\n')));
+    return pdfBytes(text, pdfOptions());
 }

@@ -66,7 +66,7 @@ PdfPageSetup setupOf(unsigned fontSize, int linesPerPage)
 TEST(PdfGeometry, LinesStandAsFarApartAsTheyAreHighOrAsTheyMustToFit)
 {
     constexpr float closest = 700 / 93.6F;
-    constexpr float broken = 700 / 1404.F;
+    constexpr float longer = 700 / 960.F;
     struct Row
     {
         unsigned fontSize;
@@ -84,7 +84,10 @@ TEST(PdfGeometry, LinesStandAsFarApartAsTheyAreHighOrAsTheyMustToFit)
         {10, 92, 92, {10, 688 / 91.F, 742}, "the closest at which they do not run into each other"},
         {10, 93, 93, {closest / 0.75F, closest, 750 - 0.8F / 0.75F * closest}, "they would: the font gives way"},
         {10, 50, 58, {10, 12, 742}, "broken lines that find room"},
-        {10, 50, 117, {10 * broken, 12 * broken, 750 - 8 * broken}, "broken lines that do not: all is smaller"},
+        {10, 50, 80, {10 * longer, 12 * longer, 750 - 8 * longer}, "a longer page: all of it is smaller"},
+        {10, 50, 117, {5, 6, 746}, "not below 5 points"},
+        {4, 50, 500, {4, 4.8F, 746.8F}, "type that is smaller already stays as it is"},
+        {10, 500, 500, {5, 3.75F, 746}, "nor for pages that are too long"},
         {10,
          60,
          120,
@@ -94,8 +97,7 @@ TEST(PdfGeometry, LinesStandAsFarApartAsTheyAreHighOrAsTheyMustToFit)
         {700, 1, 1, {700, 840, 190}, "a single line that is higher than the box keeps its size"},
     };
     for (const Row &row : rows) {
-        const LinePlacement placement =
-            placeLines(setupOf(row.fontSize, int(row.linesToFit)), box, face, row.linesToFit, row.lines);
+        const LinePlacement placement = placeLines(row.fontSize, box, face, row.linesToFit, row.lines);
         EXPECT_FLOAT_EQ(placement.fontSize, row.expected.fontSize) << row.reason;
         EXPECT_FLOAT_EQ(placement.leading, row.expected.leading) << row.reason;
         EXPECT_FLOAT_EQ(placement.firstBaseline, row.expected.firstBaseline) << row.reason;
@@ -107,11 +109,11 @@ TEST(PdfGeometry, AllLinesStandInTheBox)
     for (const int linesPerPage : {1, 2, 59, 60, 61, 72, 100, 500}) {
         for (const unsigned fontSize : {1U, 8U, 9U, 10U, 12U, 40U, 580U}) {
             for (const qsizetype lines : {qsizetype(0), qsizetype(linesPerPage), qsizetype(linesPerPage) * 3}) {
-                const LinePlacement placement =
-                    placeLines(setupOf(fontSize, linesPerPage), box, face, linesPerPage, lines);
+                const LinePlacement placement = placeLines(fontSize, box, face, linesPerPage, lines);
                 const double ascent = double(face.ascent) / 1000 * double(placement.fontSize);
                 const double descent = double(face.descent) / 1000 * double(placement.fontSize);
-                const double steps = static_cast<double>(std::max<qsizetype>(lines, 1) - 1);
+                const qsizetype taken = std::min(lines, placement.lines);
+                const double steps = static_cast<double>(std::max<qsizetype>(taken, 1) - 1);
                 const double last = double(placement.firstBaseline) - double(placement.leading) * steps;
                 const auto which = testing::Message()
                                    << linesPerPage << " lines a page, " << fontSize << " points, " << lines << " lines";
@@ -131,7 +133,7 @@ TEST(PdfGeometry, ABoxWithoutHeightStillGivesNumbersThatCanBeSaid)
         PdfPageBox none = box;
         none.bottom = bottom;
         for (const qsizetype lines : {qsizetype(1), qsizetype(60), qsizetype(100000)}) {
-            const LinePlacement placement = placeLines(setupOf(10, 60), none, face, 60, lines);
+            const LinePlacement placement = placeLines(10, none, face, 60, lines);
             EXPECT_GE(placement.fontSize, 0.0099F) << lines;
             EXPECT_GE(placement.leading, 0.0099F) << lines;
             EXPECT_LE(placement.firstBaseline, 750.F) << lines;

@@ -34,13 +34,16 @@ struct PdfFont
     QString type;
     bool isEmbedded = false;
     bool isSubset = false;
+    bool hasTextMap = false;
 };
 
 /// A PDF in a folder of its own.
 class PdfReadBack
 {
 public:
-    explicit PdfReadBack(const QByteArray &bytes) : path_(folder_.filePath(QStringLiteral("a.pdf")))
+    /// @param remark  that readers make about it on standard error
+    explicit PdfReadBack(const QByteArray &bytes, const char *remark = "")
+        : path_(folder_.filePath(QStringLiteral("a.pdf"))), remark_(remark)
     {
         QFile file(path_);
         EXPECT_TRUE(file.open(QIODevice::WriteOnly));
@@ -88,8 +91,8 @@ public:
         std::vector<PdfFont> fonts;
         for (const QString &line : QString::fromUtf8(run("pdffonts", {path_})).split(u'\n').mid(2)) {
             if (const auto match = row.match(line.trimmed()); match.hasMatch()) {
-                fonts.push_back(
-                    {match.captured(1), match.captured(2), match.captured(4) == u"yes", match.captured(5) == u"yes"});
+                const auto isYes = [&match](int column) { return match.captured(column) == u"yes"; };
+                fonts.push_back({match.captured(1), match.captured(2), isYes(4), isYes(5), isYes(6)});
             } else {
                 EXPECT_TRUE(line.isEmpty()) << line.toStdString();
             }
@@ -128,6 +131,13 @@ public:
                    : QStringLiteral("qpdf: ") + said;
     }
 
+    /// The objects and streams of the file, uncompressed.
+    QByteArray objects() const
+    {
+        return run("qpdf",
+                   {QStringLiteral("--qdf"), QStringLiteral("--object-streams=disable"), path_, QStringLiteral("-")});
+    }
+
     /// A page, from 1, in grey.
     QImage picture(int page = 1, int dotsPerInch = 100) const
     {
@@ -162,9 +172,8 @@ private:
         const bool ended = process.waitForFinished(60'000);
         EXPECT_TRUE(ended && process.exitStatus() == QProcess::NormalExit && process.exitCode() == 0)
             << program << ": " << process.readAllStandardError().toStdString();
-        // How the library maps codes to characters is remarked upon, and understood all the same.
         QByteArray said = process.readAllStandardError();
-        said.replace("Syntax Warning: Invalid 'begincidrange' operator in ToUnicode CMap\n", "");
+        said.replace(remark_, "");
         EXPECT_EQ(said.toStdString(), "") << program;
         return process.readAllStandardOutput();
     }
@@ -182,6 +191,7 @@ private:
 
     QTemporaryDir folder_;
     QString path_;
+    QByteArray remark_;
 };
 
 /// The part of a picture that is not white, and how much black there is in it (in whole dots).

@@ -9,37 +9,8 @@
 namespace
 {
 
-using kareport::pageEnd;
 using kareport::visibleCharacters;
 using kareport::visibleLine;
-
-TEST(PdfText, APageEndsBehindItsLastLineFeed)
-{
-    struct Row
-    {
-        const char *text;
-        qsizetype begin;
-        int lines;
-        qsizetype expected;
-        const char *reason;
-    };
-    constexpr Row rows[] = {
-        {"", 0, 60, 0, "empty"},
-        {"a\r\nb\r\n", 0, 1, 3, "one line"},
-        {"a\r\nb\r\n", 3, 1, 6, "the next one"},
-        {"a\r\nb\r\n", 0, 2, 6, "all lines"},
-        {"a\r\nb\r\n", 0, 60, 6, "fewer lines than a page has"},
-        {"a\r\nb\r\n", 6, 60, 6, "nothing is left"},
-        {"a\nb", 0, 2, 3, "the last line has no end"},
-        {"a\rb\n", 0, 1, 4, "a lone CR ends nothing"},
-        {"\n\n\n", 0, 2, 2, "empty lines"},
-    };
-    for (const Row &row : rows) {
-        EXPECT_EQ(pageEnd(QLatin1StringView(row.text), row.begin, row.lines), row.expected) << row.reason;
-        EXPECT_EQ(pageEnd(QStringView(QString::fromLatin1(row.text)), row.begin, row.lines), row.expected)
-            << row.reason;
-    }
-}
 
 struct LineRow
 {
@@ -83,8 +54,9 @@ TEST(PdfText, ALineOfWideCharactersIsWhatIsSeenOfIt)
 {
     constexpr LineRow rows[] = {
         {u"a\u2028b\u2029c", u"abc", "line and paragraph separators end nothing"},
-        {u"測\t量", u"測       量", "a character is a column, however wide"},
-        {u"\xD83D\xDE00\tb", u"\xD83D\xDE00       b", "a pair is one character"},
+        {u"測\t量", u"測      量", "a wide character takes two columns"},
+        {u"\xD83D\xDE00\tb", u"\xD83D\xDE00      b", "a pair is one character, and a wide one"},
+        {u"e\u0301\tb", u"e\u0301       b", "a mark takes none"},
         {u"a\xD83D", u"a\uFFFD", "half a pair at the end"},
         {u"\xDE00\xD83D", u"\uFFFD\uFFFD", "the halves in the wrong order"},
         {u"\xD83D\xD83D\xDE00", u"\uFFFD\xD83D\xDE00", "half a pair before a whole one"},
@@ -98,36 +70,57 @@ TEST(PdfText, ALineOfWideCharactersIsWhatIsSeenOfIt)
     }
 }
 
-std::string listOf(const std::vector<kareport::CharacterCount> &counts)
-{
-    std::string list;
-    for (const kareport::CharacterCount &entry : counts) {
-        list += (list.empty() ? "" : " ") + QString::number(entry.character, 16).toStdString() + "*" +
-                std::to_string(entry.count);
-    }
-    return list;
-}
-
-TEST(PdfText, CountsWhatIsSeen)
+TEST(PdfText, KnowsTheCharactersThatAreSeen)
 {
     struct Row
     {
         QStringView text;
-        const char *expected;
+        std::u32string expected;
+        const char *reason;
+    };
+    const Row rows[] = {
+        {u"", U"", "empty"},
+        {u"ba\r\na\r\n", U"ab", "each once, in the order of codes, without line ends"},
+        {u"\t\f\u007F\u0085\u2028\u2029", U"", "control characters and separators"},
+        {u"é測é", U"é測", "any script"},
+        {u"\xD83D\xDE00\uFFFF\xD83D\xDE00", U"\uFFFF\U0001F600", "pairs are one character"},
+        {u"\xD83D\xD83D\xDE00\xDE00", U"\uFFFD\U0001F600", "halves are the sign for them"},
+    };
+    for (const Row &row : rows) {
+        EXPECT_EQ(visibleCharacters(row.text), row.expected) << row.reason;
+    }
+    EXPECT_EQ(visibleCharacters(QLatin1StringView("b\xE9\r\n\xE9\x85")), U"b\u00E9") << "one byte a character";
+}
+
+TEST(PdfText, FindsTheLinesThatAreTooWide)
+{
+    struct Row
+    {
+        QStringView text;
+        qint64 count;
+        qint64 first;
+        qint64 widest;
         const char *reason;
     };
     constexpr Row rows[] = {
-        {u"", "", "empty"},
-        {u"ba\r\na\r\n", "61*2 62*1", "in the order of codes, without line ends"},
-        {u"\t\f\u007F\u0085\u2028\u2029", "", "control characters and separators"},
-        {u"é測é", "e9*2 6e2c*1", "any script"},
-        {u"\xD83D\xDE00\uFFFF\xD83D\xDE00", "ffff*1 1f600*2", "pairs are one character"},
-        {u"\xD83D\xD83D\xDE00\xDE00", "fffd*2 1f600*1", "halves are the sign for them"},
+        {u"", 0, 0, 0, "nothing"},
+        {u"12345678\r\n12345678", 0, 0, 0, "they fill the room"},
+        {u"1\r\n123456789\r\n1\r\n1234567890\r\n", 2, 2, 10, "the first and the widest"},
+        {u"12345678     \r\n", 0, 0, 0, "blanks at the end are not seen"},
+        {u"1234567\tb\n", 1, 1, 9, "a tab leads behind the room"},
+        {u"a\t\n", 0, 0, 0, "a tab at the end is not seen"},
+        {u"測測測測\n測測測測1", 1, 2, 9, "wide characters take two cells"},
+        {u"1234567e\u0301\n", 0, 0, 0, "a mark takes none"},
+        {u"1234567\U0001F600\n", 1, 1, 9, "a pair is one character, and a wide one"},
     };
     for (const Row &row : rows) {
-        EXPECT_EQ(listOf(visibleCharacters(row.text)), row.expected) << row.reason;
+        const kareport::WideLines found = kareport::wideLines(row.text, visibleCharacters(row.text), 8);
+        EXPECT_EQ(found.count, row.count) << row.reason;
+        EXPECT_EQ(found.first, row.first) << row.reason;
+        EXPECT_EQ(found.widest, row.widest) << row.reason;
     }
-    EXPECT_EQ(listOf(visibleCharacters(QLatin1StringView("b\xE9\r\n\xE9\x85"))), "62*1 e9*2") << "one byte a character";
+    const QLatin1StringView narrow("1\r\n12345678\xE9\r\n");
+    EXPECT_EQ(kareport::wideLines(narrow, visibleCharacters(narrow), 8).widest, 9) << "one byte a character";
 }
 
 } // namespace

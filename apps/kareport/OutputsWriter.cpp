@@ -47,6 +47,13 @@ ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, 
         if (isInterrupted()) {
             return stoppedBefore(output);
         }
+        if (output.kind == OutputKind::Pdf && report.IsEmpty()) {
+            // The library makes a document without a page of it, which readers refuse.
+            printError(Xlate("kareport: the report is empty, and a PDF has a page at least: \"%1\" was not written")
+                           .arg(output.file));
+            status = std::max(status, exitInput);
+            continue;
+        }
         if (!output.isStandardOutput()) {
             progress.begin(Xlate("Writing %1").arg(output.file), 0);
         }

@@ -1,4 +1,4 @@
-#include "GlyphParts.h"
+#include "FaceGlyphs.h"
 
 #include <QFile>
 
@@ -10,7 +10,7 @@
 namespace kareport
 {
 
-struct GlyphParts::Face
+struct FaceGlyphs::Face
 {
     FT_Library library = nullptr;
     FT_Face face = nullptr;
@@ -29,7 +29,7 @@ struct GlyphParts::Face
     }
 };
 
-GlyphParts::GlyphParts(const PdfFace &face) : face_(std::make_unique<Face>())
+FaceGlyphs::FaceGlyphs(const PdfFace &face) : face_(std::make_unique<Face>())
 {
     const QByteArray file = QFile::encodeName(face.file());
     if (FT_Init_FreeType(&face_->library) == 0) {
@@ -37,11 +37,11 @@ GlyphParts::GlyphParts(const PdfFace &face) : face_(std::make_unique<Face>())
     }
 }
 
-GlyphParts::~GlyphParts() = default;
-GlyphParts::GlyphParts(GlyphParts &&) noexcept = default;
-GlyphParts &GlyphParts::operator=(GlyphParts &&) noexcept = default;
+FaceGlyphs::~FaceGlyphs() = default;
+FaceGlyphs::FaceGlyphs(FaceGlyphs &&) noexcept = default;
+FaceGlyphs &FaceGlyphs::operator=(FaceGlyphs &&) noexcept = default;
 
-std::vector<unsigned> GlyphParts::of(unsigned glyph) const
+std::vector<unsigned> FaceGlyphs::partsOf(unsigned glyph) const
 {
     std::vector<unsigned> parts{glyph};
     for (std::size_t next = 0; face_->face != nullptr && next < parts.size(); ++next) {
@@ -64,6 +64,20 @@ std::vector<unsigned> GlyphParts::of(unsigned glyph) const
     }
     parts.erase(parts.begin());
     return parts;
+}
+
+QRectF FaceGlyphs::inkOf(unsigned glyph) const
+{
+    if (face_->face == nullptr || face_->face->units_per_EM == 0 ||
+        FT_Load_Glyph(face_->face, glyph, FT_LOAD_NO_SCALE) != 0)
+    {
+        return {};
+    }
+    const FT_Glyph_Metrics &metrics = face_->face->glyph->metrics;
+    const double unit = 1000.0 / face_->face->units_per_EM;
+    return {static_cast<double>(metrics.horiBearingX) * unit,
+            static_cast<double>(metrics.horiBearingY - metrics.height) * unit,
+            static_cast<double>(metrics.width) * unit, static_cast<double>(metrics.height) * unit};
 }
 
 } // namespace kareport
