@@ -222,7 +222,7 @@ std::optional<InputError> CsvObjectList::storeCells(UDataObject &object, const s
             if (!isShared(parser->id())) {
                 object.Remove(parser->id());
             }
-        } else if (!parser->store(cells[i], object)) {
+        } else if (!parser->storeValue(cells[i], object)) {
             return reader_.errorAt(reader_.placeOfCell(i),
                                    Xlate("the cell \"%1\" of the column \"%2\" does not fit: %3 was expected")
                                        .arg(quoteOf(cells[i]), columns_[i].name, parser->expected()));

@@ -192,17 +192,14 @@ ValueParser::ValueParser(int type, unsigned id, const DataUnits &units)
     }
 }
 
-bool ValueParser::isNone(std::string_view text) const
+/// Whether a text holds blanks alone where a text is not what is wanted.
+bool ValueParser::isBlankNumber(std::string_view text) const
 {
-    const bool isText = form_ == Form::Text || form_ == Form::PointNumber;
-    return text.empty() || (!isText && isBlank(text.front()) && trimmed(text).empty());
+    return form_ != Form::Text && form_ != Form::PointNumber && trimmed(text).empty();
 }
 
-bool ValueParser::store(std::string_view text, UDictionary &object) const
+bool ValueParser::storeValue(std::string_view text, UDictionary &object) const
 {
-    if (isNone(text)) {
-        return true;
-    }
     double number = 0;
     bool fits = false;
     switch (form_) {

@@ -20,11 +20,17 @@ public:
     unsigned id() const { return id_; }
 
     /// Whether a text stands for no value: an empty one, and blanks where a text is not what is wanted.
-    bool isNone(std::string_view text) const;
+    bool isNone(std::string_view text) const
+    {
+        // Asked of every cell: nearly all are answered by their first character.
+        return text.empty() || ((text.front() == ' ' || text.front() == '\t') && isBlankNumber(text));
+    }
     /// Stores the value of a UTF-8 text. One that stands for none leaves the object as it is: another variable may have
     /// the same identifier.
     /// @return whether the text fits the type
-    bool store(std::string_view text, UDictionary &object) const;
+    bool store(std::string_view text, UDictionary &object) const { return isNone(text) || storeValue(text, object); }
+    /// Stores the value of a text that stands for one.
+    bool storeValue(std::string_view text, UDictionary &object) const;
     /// Stores a number that is one already. @return whether it fits the type
     bool storeNumber(double number, UDictionary &object) const;
     bool storeBoolean(bool value, UDictionary &object) const;
@@ -43,6 +49,8 @@ private:
         Station,
         Angle ///< in degrees, minutes and seconds
     };
+
+    bool isBlankNumber(std::string_view text) const;
 
     Form form_;
     unsigned id_;
