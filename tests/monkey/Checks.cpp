@@ -1,0 +1,206 @@
+#include "World.h"
+
+#include "COneViewPane.h"
+#include "DeskFrame.h"
+#include "ReportEdit.h"
+#include "ReportTextDecoder.h"
+#include "UReportDoc.h"
+#include "UReportView.h"
+#include "UReportWindowDlg.h"
+
+#include <QApplication>
+#include <QBuffer>
+#include <QFile>
+#include <QFileInfo>
+#include <QMessageBox>
+
+#include <algorithm>
+
+namespace monkey
+{
+
+namespace
+{
+
+QString nameOf(const Seen &seen)
+{
+    return u'"' + seen.title + QStringLiteral("\" (report ") + QString::number(seen.id) + u')';
+}
+
+QString nameOf(const UReportDoc &report)
+{
+    return u'"' + report.GetTitle() + u'"';
+}
+
+/// Whether somebody can see a report, or an editor outside holds it.
+bool isWithinReach(const UReportDoc &report)
+{
+    const auto *window = dynamic_cast<const UReportWindowDlg *>(report.GetReportWindow());
+    return report.IsShown() || (window != nullptr && window->isCreated()) || report.GetExternalEditorFlag();
+}
+
+bool isRich(const UReportDoc &report)
+{
+    return report.GetText().startsWith(u"{\\rtf") || report.GetRTFDataFlag();
+}
+
+} // namespace
+
+QString World::check()
+{
+    if (!answers_.stuck.isEmpty()) {
+        return QStringLiteral("a window cannot be closed: ") + answers_.stuck.join(u' ');
+    }
+    if (QApplication::activeModalWidget() != nullptr) {
+        return QStringLiteral("a window stays open after the step");
+    }
+    for (const auto &part :
+         {&World::checkClosed, &World::checkTexts, &World::checkWindows, &World::checkActive, &World::checkPages})
+    {
+        if (const QString wrong = (this->*part)(); !wrong.isEmpty()) {
+            return wrong;
+        }
+    }
+    return {};
+}
+
+const Seen *World::seen(quint64 id) const
+{
+    const auto found = std::find_if(before_.begin(), before_.end(), [id](const Seen &seen) { return seen.id == id; });
+    return found == before_.end() ? nullptr : &*found;
+}
+
+QStringList World::writtenFiles() const
+{
+    QStringList written;
+    const QHash<QString, Stamp> now = lookAtFiles();
+    for (auto file = now.begin(); file != now.end(); ++file) {
+        if (filesBefore_.value(file.key()) != file.value()) {
+            written.append(file.key());
+        }
+    }
+    return written;
+}
+
+bool World::isKept(const QString &text) const
+{
+    const QStringList written = writtenFiles();
+    return std::any_of(written.begin(), written.end(), [&text](const QString &path) {
+        if (path.endsWith(u".rtf", Qt::CaseInsensitive)) {
+            return true; // the rich text is compared by other tests
+        }
+        QFile file(path);
+        QString kept;
+        return file.open(QIODevice::ReadOnly) && !kareport::decodeReportText(file.readAll(), kept) && kept == text;
+    });
+}
+
+QString World::checkClosed() const
+{
+    auto given = std::count_if(given_.begin(), given_.end(),
+                               [](const Answer &answer) { return answer.button == QMessageBox::No; });
+    for (const Seen &gone : closed_) {
+        const Seen *was = seen(gone.id);
+        const bool hadChanges = gone.isModified || (was != nullptr && was->isModified);
+        if (!hadChanges || gone.text.isEmpty() || isKept(gone.text)) {
+            continue;
+        }
+        if (--given < 0) {
+            return nameOf(gone) + QStringLiteral(" was closed with changes that nobody gave up");
+        }
+    }
+    return {};
+}
+
+QString World::checkTexts() const
+{
+    const bool isReloaded = std::any_of(given_.begin(), given_.end(),
+                                        [](const Answer &answer) { return answer.button == QMessageBox::Yes; });
+    for (const UReportDoc *report : reports()) {
+        const auto was = std::find_if(before_.begin(), before_.end(),
+                                      [&](const Seen &seen) { return seen.id == ids_.value(report); });
+        if (was == before_.end()) {
+            continue;
+        }
+        if (textOf(*report) != was->text && mayChange.count(report) == 0 && !(mayReload && isReloaded)) {
+            return QStringLiteral("the text of %1 has changed, which this step does not do").arg(nameOf(*was));
+        }
+        const bool isForgotten = was->isModified && !report->IsModified() && !(mayReload && isReloaded);
+        if (isForgotten && !report->IsEmpty() && !isKept(textOf(*report))) {
+            return QStringLiteral("%1 counts as saved and is in no file").arg(nameOf(*was));
+        }
+    }
+    for (const UReportView *view : viewsOnScreen()) {
+        const UReportDoc *report = view->GetDocument();
+        if (report != nullptr && !isRich(*report) && !view->ShowsFormats() &&
+            QString(textOf(*report)).replace(QStringLiteral("\r\n"), QStringLiteral("\n")) !=
+                view->GetEdit().windowText().replace(QStringLiteral("\r\n"), QStringLiteral("\n")))
+        {
+            return QStringLiteral("a view of %1 shows another text than the report has").arg(nameOf(*report));
+        }
+    }
+    return {};
+}
+
+QString World::checkWindows() const
+{
+    for (const UReportDoc *report : reports()) {
+        if (!isWithinReach(*report)) {
+            return QStringLiteral("nobody can see %1").arg(nameOf(*report));
+        }
+        if (report->GetTitle().endsWith(u" 2") && reports().size() == 1 && report->GetPathName().isEmpty() &&
+            closed_.empty() && before_.size() <= 1)
+        {
+            return QStringLiteral("the only report has a number: %1").arg(nameOf(*report));
+        }
+    }
+    return {};
+}
+
+QString World::checkActive() const
+{
+    if (frame_ == nullptr || !frame_->isVisible()) {
+        return {};
+    }
+    const std::vector<UReportView *> shown = viewsOnScreen();
+    const auto *active = dynamic_cast<UReportView *>(frame_->GetActiveView());
+    if (active != nullptr && std::find(shown.begin(), shown.end(), active) == shown.end()) {
+        return QStringLiteral("the active view is not on the screen");
+    }
+    const UReportView *typedInto = viewWithKeyboard();
+    if (typedInto != nullptr && typedInto != active) {
+        return QStringLiteral("the view with the keyboard is not the active one");
+    }
+    if (active != nullptr && typedInto == nullptr && QApplication::focusWidget() != nullptr) {
+        return QStringLiteral("the keyboard is with a %1, not with the active view")
+            .arg(QLatin1String(QApplication::focusWidget()->metaObject()->className()));
+    }
+    return {};
+}
+
+QString World::checkPages() const
+{
+    if (steps_ % 7 != 0) {
+        return {}; // a PDF takes its time
+    }
+    for (const UReportDoc *report : reports()) {
+        if (isRich(*report) || report->IsEmpty()) {
+            continue;
+        }
+        QBuffer pdf;
+        pdf.open(QIODevice::WriteOnly);
+        if (!report->WritePdf(pdf)) {
+            continue; // margins without room are told by their own message
+        }
+        const qsizetype pages = pdf.data().count("/Type /Page\n");
+        if (pages < pagesOf(*report)) {
+            return QStringLiteral("the PDF of %1 has %2 pages, the report %3")
+                .arg(nameOf(*report))
+                .arg(pages)
+                .arg(pagesOf(*report));
+        }
+    }
+    return {};
+}
+
+} // namespace monkey

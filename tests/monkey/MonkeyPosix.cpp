@@ -1,0 +1,39 @@
+#include "World.h"
+
+#include <QFile>
+
+#include <csignal>
+#include <sys/resource.h>
+#include <unistd.h>
+
+namespace monkey
+{
+
+void dieAtOnce()
+{
+    ::kill(::getpid(), SIGKILL);
+    ::_exit(1); // not reached
+}
+
+void limitFiles(qint64 bytes)
+{
+    std::signal(SIGXFSZ, SIG_IGN);
+    rlimit limit{};
+    ::getrlimit(RLIMIT_FSIZE, &limit);
+    limit.rlim_cur = bytes < 0 ? limit.rlim_max : static_cast<rlim_t>(bytes);
+    ::setrlimit(RLIMIT_FSIZE, &limit);
+}
+
+int endEditors(const QDir &folder)
+{
+    int ended = 0;
+    QDir editors(folder.filePath(QStringLiteral("editors")));
+    for (const QString &name : editors.entryList(QDir::Files)) {
+        const auto process = static_cast<pid_t>(name.toInt());
+        ended += process > 1 && ::kill(process, SIGTERM) == 0 ? 1 : 0;
+        editors.remove(name);
+    }
+    return ended;
+}
+
+} // namespace monkey

@@ -1,0 +1,15 @@
+#pragma once
+
+#include <QString>
+
+namespace monkey
+{
+
+/// How a worker says what came of its steps: by its status, and by files in its folder.
+constexpr int workerIsDone = 0;
+constexpr int workerHasFound = 10;
+inline const QString stepsName = QStringLiteral("steps");
+inline const QString doneName = QStringLiteral("done");
+inline const QString violationName = QStringLiteral("violation");
+
+} // namespace monkey

@@ -1,0 +1,131 @@
+#pragma once
+
+#include "DeskApplication.h"
+#include "DialogAnswers.h"
+#include "Steps.h"
+
+#include <QDateTime>
+#include <QDir>
+#include <QHash>
+#include <QString>
+
+#include <memory>
+#include <optional>
+#include <set>
+#include <vector>
+
+class DeskFrame;
+class UReportDoc;
+class UReportView;
+
+namespace monkey
+{
+
+/// A report as it was at some moment.
+struct Seen
+{
+    const UReportDoc *report = nullptr;
+    quint64 id = 0; ///< of the report: another one may come to stand at its place in memory
+    QString text;
+    bool isModified = false;
+    QString path;
+    QString title;
+};
+
+/// A file as it was at some moment.
+struct Stamp
+{
+    QDateTime modified;
+    qint64 size = -1;
+    quint64 inode = 0; ///< a file that was replaced is another one
+
+    bool operator==(const Stamp &) const = default;
+};
+
+/// The desk that is driven: its window, its files, and what was seen of its reports.
+class World
+{
+public:
+    /// @param folder  everything that the desk reads and writes stands below it
+    explicit World(const QString &folder);
+    ~World();
+    World(const World &) = delete;
+    World &operator=(const World &) = delete;
+
+    DeskFrame &frame() const { return *frame_; }
+    bool isOpen() const { return frame_ != nullptr; }
+    /// Ends the window after it was closed, and starts it again.
+    void restart();
+    QDir files() const { return QDir(folder_.filePath(QStringLiteral("files"))); }
+    QDir folder() const { return folder_; }
+    DialogAnswers &answers() { return answers_; }
+
+    static std::vector<UReportDoc *> reports();
+    static QString textOf(const UReportDoc &report);
+    static qsizetype pagesOf(const UReportDoc &report);
+    /// The views of all reports that stand on the screen now: in a pane that is shown, and not below another tab.
+    static std::vector<UReportView *> viewsOnScreen();
+    /// The view whose text has the keyboard; null when none has.
+    static UReportView *viewWithKeyboard();
+
+    /// Takes down what is there before a step.
+    void note();
+    /// Does a step and all that follows from it at once.
+    void run(const Step &step);
+    /// What is wrong after the step that was run last; empty when all is well.
+    QString check();
+
+    /// Lets the clock go on, so that what looks at times does.
+    void wait(int milliseconds);
+    /// The desk has written down what is open, and dies.
+    [[noreturn]] void crash();
+    /// Whether reports that were lost in a crash have come back. @return what is wrong
+    QString checkRecovered();
+    QString lastPath() const; ///< a name of a file that is there
+    QString newPath(Chance &chance) const;
+
+    // What the step that runs says of itself.
+    std::set<const UReportDoc *> mayChange; ///< texts that it edits
+    bool mayReload = false;                 ///< files were changed by somebody else
+    bool isExit = false;
+    QString did; ///< in words, for the log
+
+private:
+    class Application;
+
+    const Seen *seen(quint64 id) const;
+    quint64 idOf(const UReportDoc &report);
+    std::vector<Seen> look();
+    QHash<QString, Stamp> lookAtFiles() const;
+    void makeFiles() const;
+    /// Files that were written since the step began.
+    QStringList writtenFiles() const;
+    bool isKept(const QString &text) const;
+
+    QString checkWindows() const;
+    QString checkActive() const;
+    QString checkTexts() const;
+    QString checkClosed() const;
+    QString checkPages() const;
+
+    QDir folder_;
+    std::unique_ptr<Application> application_;
+    std::unique_ptr<DeskFrame> frame_;
+    DialogAnswers answers_;
+    QHash<const UReportDoc *, quint64> ids_;
+    quint64 lastId_ = 0;
+    std::vector<Seen> before_;
+    std::vector<Seen> closed_; ///< as they were when they were closed
+    QHash<QString, Stamp> filesBefore_;
+    std::vector<Answer> given_;
+    quint64 steps_ = 0;
+};
+
+/// What differs from system to system.
+[[noreturn]] void dieAtOnce();
+/// Lets files grow to so many bytes from now on; below 0 without end.
+void limitFiles(qint64 bytes);
+/// Ends the editors that this desk has started. @return their number
+int endEditors(const QDir &folder);
+
+} // namespace monkey
