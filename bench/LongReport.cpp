@@ -1,0 +1,124 @@
+// A long report opened at the desk, or a text in a bare control in pieces of 10,000 lines: from the call to all of it
+// shown, and the longest time in which the window did not answer.
+//
+//   ka_long_report FILE [--bare]
+#include "DeskApplication.h"
+#include "DeskDialogs.h"
+#include "DeskFrame.h"
+#include "Profile.h"
+#include "ReportEdit.h"
+#include "ReportEntry.h"
+#include "UReportDoc.h"
+#include "UReportView.h"
+
+#include <QApplication>
+#include <QElapsedTimer>
+#include <QFile>
+#include <QFontDatabase>
+#include <QPlainTextEdit>
+#include <QTextBlock>
+#include <QTimer>
+
+#include <algorithm>
+#include <cstdio>
+#include <functional>
+
+namespace
+{
+
+/// Ticks as often as it can and keeps the longest time between two ticks.
+class Pulse
+{
+public:
+    Pulse()
+    {
+        QObject::connect(&timer_, &QTimer::timeout, &timer_, [this] { beat(); });
+        timer_.start(1);
+        since_.start();
+    }
+    void beat() { longest_ = std::max(longest_, since_.restart()); }
+    qint64 longest() const { return longest_; }
+
+private:
+    QTimer timer_;
+    QElapsedTimer since_;
+    qint64 longest_ = 0;
+};
+
+void waitUntil(const std::function<bool()> &isDone)
+{
+    while (!isDone()) {
+        QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
+    }
+}
+
+void openBare(const QByteArray &bytes, QPlainTextEdit &edit)
+{
+    constexpr int linesOfPiece = 10'000;
+    edit.setUndoRedoEnabled(false);
+    edit.show();
+    for (qsizetype at = 0; at < bytes.size();) {
+        qsizetype end = at;
+        for (int line = 0; line < linesOfPiece && end < bytes.size(); ++line) {
+            const qsizetype feed = bytes.indexOf('\n', end);
+            end = feed < 0 ? bytes.size() : feed + 1;
+        }
+        QTextCursor cursor(edit.document());
+        cursor.movePosition(QTextCursor::End);
+        cursor.insertText(QString::fromUtf8(QByteArrayView(bytes).sliced(at, end - at)));
+        at = end;
+        QCoreApplication::processEvents();
+    }
+}
+
+} // namespace
+
+int main(int argc, char **argv)
+{
+    QApplication application(argc, argv);
+    QApplication::setApplicationName(QStringLiteral("KaReport"));
+    kareport::setProfileStore(kareport::makeMemoryProfile());
+    const QStringList arguments = QApplication::arguments();
+    if (arguments.size() < 2) {
+        std::fprintf(stderr, "ka_long_report FILE [--bare]\n");
+        return 1;
+    }
+    const bool isBare = arguments.value(2) == QStringLiteral("--bare");
+    QFile file(arguments[1]);
+    if (isBare && !file.open(QIODevice::ReadOnly)) {
+        return 1;
+    }
+    DeskApplication desk;
+    DeskFrame frame;
+    kareport::installDialogs(&frame);
+    QPlainTextEdit edit;
+    edit.setFont(QFontDatabase::systemFont(QFontDatabase::FixedFont));
+    edit.setLineWrapMode(QPlainTextEdit::NoWrap);
+    edit.resize(1000, 700);
+    if (!isBare) {
+        frame.show();
+    }
+    QCoreApplication::processEvents();
+    Pulse pulse;
+    QElapsedTimer time;
+    time.start();
+    int lines = 0;
+    if (isBare) {
+        openBare(file.readAll(), edit);
+        lines = edit.document()->blockCount();
+    } else {
+        if (!frame.OpenFile(arguments[1])) {
+            return 1;
+        }
+        const auto *report = dynamic_cast<UReportDoc *>(GetReportTemplate()->GetDocuments().back());
+        auto *view = dynamic_cast<UReportView *>(report->GetViews().front());
+        waitUntil([view] { return !view->GetEdit().isLoading(); });
+        lines = view->GetEdit().document()->blockCount();
+    }
+    QCoreApplication::processEvents();
+    pulse.beat();
+    std::printf("{\"seconds\": %.3f, \"longest_pause_ms\": %lld, \"lines\": %d}\n",
+                static_cast<double>(time.elapsed()) / 1000, static_cast<long long>(pulse.longest()), lines);
+    std::fflush(stdout);
+    std::_Exit(0); // what it takes to give it all up is not measured
+}
