@@ -10,6 +10,7 @@
 
 #include <QApplication>
 #include <QBuffer>
+#include <QDockWidget>
 #include <QFile>
 #include <QFileInfo>
 #include <QMessageBox>
@@ -163,17 +164,28 @@ QString World::checkActive() const
         return {};
     }
     const std::vector<UReportView *> shown = viewsOnScreen();
+    const COneViewPane *pane = frame_->GetActivePane();
+    const QDockWidget *dock = pane != nullptr ? pane->GetDock() : nullptr;
+    if (!shown.empty() && (dock == nullptr || dock->visibleRegion().isEmpty())) {
+        return QStringLiteral("a report is on the screen, and no pane on the screen is active");
+    }
     const auto *active = dynamic_cast<UReportView *>(frame_->GetActiveView());
-    if (active != nullptr && std::find(shown.begin(), shown.end(), active) == shown.end()) {
+    if (active != nullptr && active->GetParentPane() == pane &&
+        std::find(shown.begin(), shown.end(), active) == shown.end())
+    {
         return QStringLiteral("the active view is not on the screen");
     }
     const UReportView *typedInto = viewWithKeyboard();
-    if (typedInto != nullptr && typedInto != active) {
+    if (typedInto != nullptr && (typedInto != active || typedInto->GetParentPane() != pane)) {
         return QStringLiteral("the view with the keyboard is not the active one");
     }
-    if (active != nullptr && typedInto == nullptr && QApplication::focusWidget() != nullptr) {
-        return QStringLiteral("the keyboard is with a %1, not with the active view")
-            .arg(QLatin1String(QApplication::focusWidget()->metaObject()->className()));
+    const QWidget *focus = QApplication::focusWidget();
+    if (dock != nullptr && focus != nullptr && !dock->isAncestorOf(focus)) {
+        return QStringLiteral("the keyboard is with a %1, not in the active pane")
+            .arg(QLatin1String(focus->metaObject()->className()));
+    }
+    if (typedInto != nullptr && frame_->GetCommandDocument() != typedInto->GetDocument()) {
+        return QStringLiteral("commands are not for the report that has the keyboard");
     }
     return {};
 }

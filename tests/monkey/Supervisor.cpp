@@ -102,8 +102,8 @@ Outcome Supervisor::run(const Steps &steps)
         if (worker.exitStatus() == QProcess::NormalExit && worker.exitCode() == workerIsDone) {
             return outcome;
         }
-        if (!isStuck && worker.exitStatus() == QProcess::CrashExit && lines.value(lines.size() - 1).endsWith(u"crash"))
-        {
+        if (!isStuck && worker.exitStatus() == QProcess::CrashExit &&
+            lines.value(lines.size() - 1).startsWith(u"crash ")) {
             from = QString::number(outcome.step); // as it was asked to
             continue;
         }
