@@ -17,6 +17,10 @@ KAREPORT_EXPORT void LoadKaReport();
 namespace kareport
 {
 
+/// Tells all reports that the application goes on, because the user has cancelled its exit or it was refused: they close
+/// normally again (`UReportDoc::SetCloseDocument`). A main frame whose `closeEvent` refuses calls it.
+KAREPORT_EXPORT void noteExitCancelled();
+
 /// A new document template for reports with panes and views of the host's own; with none given, reports are made without
 /// windows. `ReportInitialTemplate` makes the usual one.
 KAREPORT_EXPORT std::unique_ptr<UDocTemplate> makeReportTemplate(UDocTemplate::PaneFactory makePane = {},

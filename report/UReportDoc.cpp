@@ -139,15 +139,12 @@ void UReportDoc::WriteHeader()
 bool UReportDoc::textWritten(QStringView text, int style)
 {
     const bool isTaken = kareport::whileMemoryLasts(false, [&] {
-        // The window takes back nothing, so what may fail comes before it.
-        const QString piece = reportWindow_ != nullptr ? text.toString() : QString();
-        if (!image_.write(text, style, imageForm())) {
-            return false;
-        }
+        // The window is told first: a host's window may look at the rich text, which then ends before the piece. It takes
+        // nothing back, so a piece that the rich text has no memory for stays in the window alone.
         if (reportWindow_ != nullptr) {
-            reportWindow_->WriteLine(piece);
+            reportWindow_->WriteLine(text.toString());
         }
-        return true;
+        return image_.write(text, style, imageForm());
     });
     if (isTaken) {
         SetModifiedFlag(true);

@@ -249,8 +249,8 @@ public:
 
     QString &GetTitle() { return title_; }
     const QString &GetTitle() const { return title_; }
-    /// Sets the title and the header line. While an open pane has the title as its caption, the document's title gets a
-    /// number from 2 behind it; the header line keeps the title as given.
+    /// Sets the title and the header line. While an open pane of another document has the title as its caption, the
+    /// document's title gets a number from 2 after it; the header line keeps the title as given. An empty title gets none.
     void SetTitle(const QString &title) override;
     /// Sets the text of the report's own pane.
     void SetWindowTextW(const QString &text);

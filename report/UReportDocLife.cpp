@@ -17,14 +17,14 @@ using kareport::showsReport;
 namespace
 {
 
-/// Whether an open pane has the title, with the number that it has among several of one document or without.
-bool isTaken(const QString &title)
+/// Whether an open pane of another document has the title as its caption. No title is nobody's.
+bool isTaken(const QString &title, const UDocument &document)
 {
+    if (title.isEmpty()) {
+        return false;
+    }
     QStringList captions;
-    QStringList titles;
-    CViewPane::GetPaneCaptions(captions);
-    CViewPane::GetPaneTitles(titles);
-    captions += titles;
+    CViewPane::GetPaneCaptions(captions, &document);
     return std::any_of(captions.begin(), captions.end(),
                        [&title](const QString &caption) { return kareport::equalFolded(title, caption); });
 }
@@ -37,7 +37,7 @@ void UReportDoc::SetTitle(const QString &title)
         const QString given = title; // may be the very title that is numbered below
         title_ = given;
         SetHeader();
-        for (int number = 2; isTaken(title_); ++number) {
+        for (int number = 2; isTaken(title_, *this); ++number) {
             title_ = given + u' ' + QString::number(number);
         }
         UDocument::SetTitle(title_);

@@ -86,8 +86,7 @@ TEST(DeskFrame, OpensWhatItIsGiven)
         UReportDoc *report = Desk::reports().front();
         EXPECT_EQ(Desk::textOf(*report), QString::fromUtf8(row.text)) << row.reason;
         EXPECT_EQ(UApplication::Get()->GetCurrentReport(), report) << row.reason;
-        ASSERT_NE(desk.frame->GetActiveView(), nullptr) << row.reason;
-        EXPECT_EQ(desk.frame->GetActiveView()->GetDocument(), report) << row.reason;
+        EXPECT_EQ(desk.frame->GetCommandDocument(), report) << row.reason;
         desk.answer = MessageAnswer::No;
         EXPECT_EQ(UApplication::Get()->GetRecentFileList().value(0), folder.path(row.name)) << row.reason;
     }

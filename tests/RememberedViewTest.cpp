@@ -50,6 +50,8 @@ TEST(RememberedView, GetsItsPlaceBack)
     document.SetAutoDelete(false);
     auto *pane = new ToppedPane(log);
     UView *view = addRecordingView(*pane, document);
+    EXPECT_FALSE(RememberedView(view).bringToTop()) << "nobody would see it";
+    pane->ShowPane(true);
     RememberedView(view).reactivate();
     EXPECT_EQ(pane->tops, 1) << "also without a frame";
 

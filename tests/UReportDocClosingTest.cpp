@@ -155,7 +155,7 @@ TEST(UReportDocClosing, ATitleThatIsGivenAgainIsNumberedFromTheSameTitle)
     EXPECT_EQ(report.GetTitle(), QStringLiteral("N 3"));
 }
 
-TEST(UReportDocClosing, ANumberedPaneHasItsTitleTaken)
+TEST(UReportDocClosing, TheCaptionOfANumberedPaneIsNotItsTitle)
 {
     const FixedSurroundings surroundings;
     ReportApplication application;
@@ -165,7 +165,8 @@ TEST(UReportDocClosing, ANumberedPaneHasItsTitleTaken)
     EXPECT_EQ(first->GetViews()[0]->GetParentPane()->GetCaption(), QStringLiteral("N:1"));
     EXPECT_EQ(first->GetViews()[1]->GetParentPane()->GetCaption(), QStringLiteral("N:2"))
         << "the new pane has the report's title";
-    EXPECT_EQ(application.create(QStringLiteral("N"))->GetTitle(), QStringLiteral("N 2"));
+    EXPECT_EQ(application.create(QStringLiteral("N"))->GetTitle(), QStringLiteral("N")) << "no caption is N";
+    EXPECT_EQ(application.create(QStringLiteral("N:2"))->GetTitle(), QStringLiteral("N:2 2")) << "but one is N:2";
 }
 
 TEST(UReportDocClosing, AFileThatCannotBeOpenedLeavesTheGivenPaneAsItWas)

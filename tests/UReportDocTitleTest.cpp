@@ -85,15 +85,37 @@ TEST(UReportDocTitle, TheFirstFreeNumberFrom2IsTaken)
     }
 }
 
-TEST(UReportDocTitle, AReportsOwnPaneCountsAsOpen)
+TEST(UReportDocTitle, AReportsOwnPanesDoNotCount)
 {
     const FixedSurroundings surroundings;
     ReportApplication application;
     UReportDoc *report = application.create(QStringLiteral("N"));
     report->SetTitle(QStringLiteral("N"));
-    EXPECT_EQ(report->GetTitle(), QStringLiteral("N 2"));
+    EXPECT_EQ(report->GetTitle(), QStringLiteral("N"));
+    report->Activate(true);
     report->SetTitle(QStringLiteral("N"));
-    EXPECT_EQ(report->GetTitle(), QStringLiteral("N")) << "its caption is N 2 by now";
+    EXPECT_EQ(report->GetTitle(), QStringLiteral("N")) << "nor do several";
+    for (int run = 1; run <= 3; ++run) {
+        report->UpdateReportInfo(QStringLiteral("N"), true, false);
+        EXPECT_EQ(report->GetTitle(), QStringLiteral("N")) << "run " << run;
+    }
+    CViewPane other;
+    other.SetWindowTextW(QStringLiteral("N"));
+    report->SetTitle(QStringLiteral("N"));
+    EXPECT_EQ(report->GetTitle(), QStringLiteral("N 2")) << "another document's pane";
+    report->SetTitle(QStringLiteral("N"));
+    EXPECT_EQ(report->GetTitle(), QStringLiteral("N 2")) << "and the same again";
+}
+
+TEST(UReportDocTitle, AnEmptyTitleIsNeverNumbered)
+{
+    const FixedSurroundings surroundings;
+    ReportApplication application;
+    for (int i = 0; i < 3; ++i) {
+        UReportDoc *report = application.create(QString());
+        report->SetTitle(QLatin1String(""));
+        EXPECT_EQ(report->GetTitle(), QString()) << i;
+    }
 }
 
 TEST(UReportDocTitle, TheFrameWindowIsThePaneOfTheFirstReportView)
@@ -155,14 +177,14 @@ TEST(UReportDocTitle, VisiblePanesAreNumberedFrom1AndAnOnlyOneHasNoNumber)
     };
     const Row rows[] = {
         {{0}, {true}, {0}, "an only pane"},
-        {{0}, {false}, {9}, "a hidden pane is not looked at"},
+        {{0}, {false}, {0}, "a hidden pane has none"},
         {{0, 1}, {true, true}, {1, 2}, "two panes in the order of their views"},
         {{1, 0}, {true, true}, {2, 1}, "two panes in the order of their views"},
-        {{0, 1}, {true, false}, {0, 9}, "one of two can be seen"},
-        {{0, 1}, {false, true}, {9, 0}, "one of two can be seen"},
+        {{0, 1}, {true, false}, {0, 0}, "one of two can be seen"},
+        {{0, 1}, {false, true}, {0, 0}, "one of two can be seen"},
         {{0, 0}, {true}, {0}, "two views in one pane"},
         {{0, 1, 0, 2}, {true, true, true}, {1, 2, 3}, "a pane counts once"},
-        {{2, 1, 0}, {true, false, true}, {2, 9, 1}, "the hidden one takes no number"},
+        {{2, 1, 0}, {true, false, true}, {2, 0, 1}, "the hidden one takes no number"},
         {{}, {true}, {9}, "a pane of another document"},
     };
     for (const Row &row : rows) {
@@ -175,6 +197,8 @@ TEST(UReportDocTitle, VisiblePanesAreNumberedFrom1AndAnOnlyOneHasNoNumber)
         }
         for (std::size_t i = 0; i < row.visible.size(); ++i) {
             panes[i].ShowPane(row.visible[i]);
+        }
+        for (std::size_t i = 0; i < row.visible.size(); ++i) {
             panes[i].SetWindowNumber(9);
             panes[i].titleUpdates = 0;
         }

@@ -31,6 +31,35 @@ TEST(UReportDocWindow, BecomesActiveAndGetsTheKeyboard)
     without.SetReportWindowActive();
 }
 
+/// Looks at the rich text of its report when a piece comes.
+class LookingWindow : public TestReportWindow
+{
+public:
+    void WriteLine(const QString &piece) override
+    {
+        QString richText;
+        report->GetRTFData(richText);
+        comesFirst = comesFirst && !richText.contains(piece);
+    }
+    const UReportDoc *report = nullptr;
+    bool comesFirst = true;
+};
+
+TEST(UReportDocWindow, GetsAPieceBeforeTheRichTextDoes)
+{
+    const FixedSurroundings surroundings;
+    UReportDoc report;
+    auto *window = new LookingWindow;
+    window->report = &report;
+    report.SetReportWindow(window);
+    report.SetRTFDataFlag(true);
+    report.WriteLine(QStringLiteral("alpha"), 0, 1, 1);
+    EXPECT_TRUE(window->comesFirst);
+    QString richText;
+    report.GetRTFData(richText);
+    EXPECT_TRUE(richText.contains(QStringLiteral("alpha"))) << "and it does";
+}
+
 TEST(UReportDocWindow, IsShownAndHidden)
 {
     WindowedReport t;
@@ -154,6 +183,7 @@ TEST(UReportDocWindow, TheActiveViewIsRememberedAndGetsItsPlaceBack)
     worked.SetAutoDelete(false);
     ToppedPane pane;
     UView *view = showIn<UView>(pane, worked);
+    pane.ShowPane(true);
 
     /// Takes the active view's place when it is created, as windows do.
     class GreedyWindow : public TestReportWindow

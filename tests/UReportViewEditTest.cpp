@@ -207,7 +207,7 @@ TEST(UReportViewEdit, OneViewClosesWhileTheOtherEdits)
     EXPECT_EQ(second.GetEdit().toPlainText(), QStringLiteral("cabone\n"));
 }
 
-TEST(UReportViewEdit, OfOtherViewsOnlyTheChangeIsTold)
+TEST(UReportViewEdit, AHostsViewsAreToldOfEveryEditInTheSameWay)
 {
     ShownReport t(QStringLiteral("one\r\ntwo\r\n"));
     UReportView &view = t.open();
@@ -216,12 +216,35 @@ TEST(UReportViewEdit, OfOtherViewsOnlyTheChangeIsTold)
     putCursor(view.GetEdit(), 4);
     QTest::keyClick(&view.GetEdit(), Qt::Key_X);
     ASSERT_EQ(recorder->updates.size(), 1U);
-    EXPECT_EQ(recorder->updates[0].sender, &view);
-    EXPECT_EQ(recorder->updates[0].hint, kareport::ReportChange::hint);
-    EXPECT_NE(recorder->updates[0].hintObject, nullptr);
+    EXPECT_EQ(recorder->updates[0], (RecordingView::Update{&view, 0, nullptr})) << "one character";
     view.OnChange();
     ASSERT_EQ(recorder->updates.size(), 2U);
     EXPECT_EQ(recorder->updates[1], (RecordingView::Update{&view, 0, nullptr})) << "the whole text was taken over";
+}
+
+/// Counts how often the whole text was loaded into a view.
+int loadsOf(UReportView &view, const std::function<void()> &act)
+{
+    int loads = 0;
+    const auto counting = QObject::connect(view.GetEdit().document(), &QTextDocument::contentsChange, view.GetWidget(),
+                                           [&loads, &view](int position, int removed, int) {
+                                               loads += position == 0 && removed >= view.GetEdit().toPlainText().size();
+                                           });
+    const QTextDocument *before = view.GetEdit().document();
+    act();
+    QObject::disconnect(counting);
+    return loads + (view.GetEdit().document() != before ? 1 : 0);
+}
+
+TEST(UReportViewEdit, OtherViewsOfTheReportTakeOverOnlyTheChange)
+{
+    ShownReport t(QStringLiteral("one\r\ntwo\r\nthree\r\n"));
+    UReportView &view = t.open();
+    UReportView &other = t.open();
+    putCursor(view.GetEdit(), 4);
+    EXPECT_EQ(loadsOf(other, [&view] { QTest::keyClicks(&view.GetEdit(), QStringLiteral("xyz")); }), 0);
+    EXPECT_EQ(other.GetEdit().toPlainText(), QStringLiteral("one\nxyztwo\nthree\n"));
+    EXPECT_EQ(loadsOf(other, [&t] { t.report.UpdateAllViews(nullptr); }), 1) << "an update by anybody else loads all";
 }
 
 TEST(UReportViewEdit, AHintFromAnotherKindOfViewReloads)
@@ -231,8 +254,8 @@ TEST(UReportViewEdit, AHintFromAnotherKindOfViewReloads)
     RecordingView other;
     t.report.SetData(QStringLiteral("two"));
     int hintObject = 0;
-    t.report.UpdateAllViews(&other, kareport::ReportChange::hint, &hintObject);
-    EXPECT_EQ(view.GetEdit().toPlainText(), QStringLiteral("two")) << "its number means something else there";
+    t.report.UpdateAllViews(&other, 1, &hintObject);
+    EXPECT_EQ(view.GetEdit().toPlainText(), QStringLiteral("two")) << "whatever its number means there";
     t.report.SetData(QStringLiteral("three"));
     t.report.UpdateAllViews(nullptr, 7, nullptr);
     EXPECT_EQ(view.GetEdit().toPlainText(), QStringLiteral("three"));

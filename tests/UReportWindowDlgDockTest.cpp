@@ -112,7 +112,8 @@ TEST_F(ReportWindowDock, BringsThePaneOfThePreviousViewToTheFront)
     window.ActivatePreviousView();
     WindowDesk::settle();
     EXPECT_TRUE(isSeen());
-    EXPECT_NE(desk.frame->GetActiveView(), view) << "it is brought to the front, not made the active one";
+    EXPECT_EQ(desk.frame->GetActiveView(), view) << "what is in front is active";
+    EXPECT_TRUE(view->GetEdit().hasFocus());
 
     view->GetParentPane()->ClosePane();
     EXPECT_EQ(window.GetPreviousView(), nullptr);

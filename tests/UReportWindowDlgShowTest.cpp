@@ -25,7 +25,8 @@ TEST_F(ReportWindowShow, ShowingOpensTheReportInAViewOfItsOwn)
     ASSERT_NE(view, nullptr);
     EXPECT_TRUE(view->GetParentPane()->IsVisible());
     EXPECT_EQ(view->GetEdit().toPlainText(), QStringLiteral("  first\nsecond\n"));
-    EXPECT_EQ(activeView(), before->GetViews().front()) << "the view before is the active one again";
+    EXPECT_EQ(activeView(), view) << "what came to the front last";
+    EXPECT_TRUE(view->GetEdit().hasFocus());
     EXPECT_TRUE(report->IsModified());
 }
 
@@ -91,7 +92,7 @@ TEST_F(ReportWindowShow, PrintingOpensAHiddenViewAndPrints)
     EXPECT_EQ(printing.printedPages(), 1);
     ASSERT_EQ(report->GetViews().size(), 2U);
     EXPECT_FALSE(report->GetViews().back()->GetParentPane()->IsVisible()) << "the view that was made for it";
-    EXPECT_EQ(activeView(), before->GetViews().front());
+    EXPECT_EQ(activeView(), report->GetViews().front()) << "its views were updated, which shows its own pane";
     EXPECT_EQ(dynamic_cast<UReportView *>(report->GetViews().front())->GetEdit().toPlainText(),
               QStringLiteral("  first\nsecond\n"))
         << "printed from the first view, which holds the text then";

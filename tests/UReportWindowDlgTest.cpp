@@ -113,6 +113,15 @@ TEST_F(ReportWindow, TheBarStandsAboveTheList)
         << "it follows the window";
 }
 
+TEST_F(ReportWindow, ItsPartsAreKnownByTheirNumbers)
+{
+    ASSERT_TRUE(create());
+    EXPECT_EQ(window.GetList()->GetDlgCtrlID(), 11005);
+    EXPECT_EQ(window.GetToolBar()->GetDlgCtrlID(), 11018);
+    window.GetList()->Resize(3, 40, 200, 60);
+    EXPECT_EQ(window.GetList()->geometry(), QRect(3, 40, 200, 60)) << "as one that was created by itself";
+}
+
 TEST_F(ReportWindow, ShowsLinesAsTheyAreWritten)
 {
     ASSERT_TRUE(create());

@@ -661,6 +661,146 @@
         <translation>Fehler</translation>
     </message>
     <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;File</source>
+        <translation>&amp;Datei</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;New	Ctrl+N</source>
+        <translation>&amp;Neu	Ctrl+N</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Open...	Ctrl+O</source>
+        <translation>Ö&amp;ffnen...	Ctrl+O</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Close</source>
+        <translation>S&amp;chließen</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Save	Ctrl+S</source>
+        <translation>&amp;Speichern	Ctrl+S</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>Save &amp;As...</source>
+        <translation>Speichern &amp;unter...</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>Update Text</source>
+        <translation>Text aktualisieren</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Print...	Ctrl+P</source>
+        <translation>&amp;Drucken...	Ctrl+P</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>Print Pre&amp;view</source>
+        <translation>Druckv&amp;orschau</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>Pa&amp;ge Setup...</source>
+        <translation>Seite ein&amp;richten...</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>Recent File</source>
+        <translation>Zuletzt verwendete Dateien</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>E&amp;xit</source>
+        <translation>&amp;Beenden</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Edit</source>
+        <translation>&amp;Bearbeiten</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Undo	Ctrl+Z</source>
+        <translation>&amp;Rückgängig	Ctrl+Z</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>Cu&amp;t	Ctrl+X</source>
+        <translation>A&amp;usschneiden	Ctrl+X</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Copy	Ctrl+C</source>
+        <translation>&amp;Kopieren	Ctrl+C</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Paste	Ctrl+V</source>
+        <translation>&amp;Einfügen	Ctrl+V</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;View</source>
+        <translation>&amp;Ansicht</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Toolbar</source>
+        <translation>&amp;Symbolleiste</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Status Bar</source>
+        <translation>S&amp;tatusleiste</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Window</source>
+        <translation>&amp;Fenster</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;New Window</source>
+        <translation>&amp;Neues Fenster</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Cascade</source>
+        <translation>Ü&amp;berlappend</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Tile Horizontally</source>
+        <translation>&amp;Untereinander</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>Tile Vertically</source>
+        <translation>Nebeneinander</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Arrange Icons</source>
+        <translation>&amp;Symbole anordnen</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Help</source>
+        <translation>&amp;Hilfe</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;About...</source>
+        <translation>Ü&amp;ber KaReport...</translation>
+    </message>
+    <message>
         <location filename="../ui/ReportResources.cpp"/>
         <source>KaReport</source>
         <translation>KaReport</translation>
@@ -1397,98 +1537,13 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;File</source>
-        <translation>&amp;Datei</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;New	Ctrl+N</source>
-        <translation>&amp;Neu	Ctrl+N</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>New from &amp;Template...	Ctrl+T</source>
         <translation>Neu aus &amp;Vorlage...	Ctrl+T</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Open...	Ctrl+O</source>
-        <translation>Ö&amp;ffnen...	Ctrl+O</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Close	Ctrl+W</source>
-        <translation>S&amp;chließen	Ctrl+W</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Save	Ctrl+S</source>
-        <translation>&amp;Speichern	Ctrl+S</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Save &amp;As...	Ctrl+Shift+S</source>
-        <translation>Speichern &amp;unter...	Ctrl+Shift+S</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Update Text</source>
-        <translation>Text aktualisieren</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Print...	Ctrl+P</source>
-        <translation>&amp;Drucken...	Ctrl+P</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Print Pre&amp;view</source>
-        <translation>Druckv&amp;orschau</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Pa&amp;ge Setup...</source>
-        <translation>Seite ein&amp;richten...</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Recent File</source>
-        <translation>Zuletzt verwendete Dateien</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>E&amp;xit	Ctrl+Q</source>
-        <translation>&amp;Beenden	Ctrl+Q</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Edit</source>
-        <translation>&amp;Bearbeiten</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Undo	Ctrl+Z</source>
-        <translation>&amp;Rückgängig	Ctrl+Z</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Redo	Ctrl+Shift+Z</source>
         <translation>&amp;Wiederholen	Ctrl+Shift+Z</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Cu&amp;t	Ctrl+X</source>
-        <translation>A&amp;usschneiden	Ctrl+X</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Copy	Ctrl+C</source>
-        <translation>&amp;Kopieren	Ctrl+C</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Paste	Ctrl+V</source>
-        <translation>&amp;Einfügen	Ctrl+V</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
@@ -1522,21 +1577,6 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;View</source>
-        <translation>&amp;Ansicht</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Toolbar</source>
-        <translation>&amp;Symbolleiste</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Status Bar</source>
-        <translation>S&amp;tatusleiste</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Zoom &amp;In	Ctrl++</source>
         <translation>&amp;Vergrößern	Ctrl++</translation>
     </message>
@@ -1549,51 +1589,6 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Usual Size	Ctrl+0</source>
         <translation>&amp;Normale Größe	Ctrl+0</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Window</source>
-        <translation>&amp;Fenster</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;New Window</source>
-        <translation>&amp;Neues Fenster</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Cascade</source>
-        <translation>Ü&amp;berlappend</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Tile Horizontally</source>
-        <translation>&amp;Untereinander</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Tile Vertically</source>
-        <translation>Nebeneinander</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Arrange Icons</source>
-        <translation>&amp;Symbole anordnen</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Help</source>
-        <translation>&amp;Hilfe</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Help	F1</source>
-        <translation>&amp;Hilfe	F1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;About...</source>
-        <translation>Ü&amp;ber KaReport...</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>

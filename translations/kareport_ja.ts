@@ -661,6 +661,146 @@
         <translation>エラー</translation>
     </message>
     <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;File</source>
+        <translation>ファイル(&amp;F)</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;New	Ctrl+N</source>
+        <translation>新規作成(&amp;N)	Ctrl+N</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Open...	Ctrl+O</source>
+        <translation>開く(&amp;O)...	Ctrl+O</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Close</source>
+        <translation>閉じる(&amp;C)</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Save	Ctrl+S</source>
+        <translation>上書き保存(&amp;S)	Ctrl+S</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>Save &amp;As...</source>
+        <translation>名前を付けて保存(&amp;A)...</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>Update Text</source>
+        <translation>テキストを更新</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Print...	Ctrl+P</source>
+        <translation>印刷(&amp;P)...	Ctrl+P</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>Print Pre&amp;view</source>
+        <translation>印刷プレビュー(&amp;V)</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>Pa&amp;ge Setup...</source>
+        <translation>ページ設定(&amp;G)...</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>Recent File</source>
+        <translation>最近使ったファイル</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>E&amp;xit</source>
+        <translation>終了(&amp;X)</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Edit</source>
+        <translation>編集(&amp;E)</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Undo	Ctrl+Z</source>
+        <translation>元に戻す(&amp;U)	Ctrl+Z</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>Cu&amp;t	Ctrl+X</source>
+        <translation>切り取り(&amp;T)	Ctrl+X</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Copy	Ctrl+C</source>
+        <translation>コピー(&amp;C)	Ctrl+C</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Paste	Ctrl+V</source>
+        <translation>貼り付け(&amp;P)	Ctrl+V</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;View</source>
+        <translation>表示(&amp;V)</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Toolbar</source>
+        <translation>ツールバー(&amp;T)</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Status Bar</source>
+        <translation>ステータスバー(&amp;S)</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Window</source>
+        <translation>ウィンドウ(&amp;W)</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;New Window</source>
+        <translation>新しいウィンドウ(&amp;N)</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Cascade</source>
+        <translation>重ねて表示(&amp;C)</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Tile Horizontally</source>
+        <translation>上下に並べて表示(&amp;T)</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>Tile Vertically</source>
+        <translation>左右に並べて表示</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Arrange Icons</source>
+        <translation>アイコンの整列(&amp;A)</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;Help</source>
+        <translation>ヘルプ(&amp;H)</translation>
+    </message>
+    <message>
+        <location filename="../ui/ReportMenu.cpp"/>
+        <source>&amp;About...</source>
+        <translation>バージョン情報(&amp;A)...</translation>
+    </message>
+    <message>
         <location filename="../ui/ReportResources.cpp"/>
         <source>KaReport</source>
         <translation>KaReport</translation>
@@ -1397,98 +1537,13 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;File</source>
-        <translation>ファイル(&amp;F)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;New	Ctrl+N</source>
-        <translation>新規作成(&amp;N)	Ctrl+N</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>New from &amp;Template...	Ctrl+T</source>
         <translation>テンプレートから新規作成(&amp;T)...	Ctrl+T</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Open...	Ctrl+O</source>
-        <translation>開く(&amp;O)...	Ctrl+O</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Close	Ctrl+W</source>
-        <translation>閉じる(&amp;C)	Ctrl+W</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Save	Ctrl+S</source>
-        <translation>上書き保存(&amp;S)	Ctrl+S</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Save &amp;As...	Ctrl+Shift+S</source>
-        <translation>名前を付けて保存(&amp;A)...	Ctrl+Shift+S</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Update Text</source>
-        <translation>テキストを更新</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Print...	Ctrl+P</source>
-        <translation>印刷(&amp;P)...	Ctrl+P</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Print Pre&amp;view</source>
-        <translation>印刷プレビュー(&amp;V)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Pa&amp;ge Setup...</source>
-        <translation>ページ設定(&amp;G)...</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Recent File</source>
-        <translation>最近使ったファイル</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>E&amp;xit	Ctrl+Q</source>
-        <translation>終了(&amp;X)	Ctrl+Q</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Edit</source>
-        <translation>編集(&amp;E)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Undo	Ctrl+Z</source>
-        <translation>元に戻す(&amp;U)	Ctrl+Z</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Redo	Ctrl+Shift+Z</source>
         <translation>やり直し(&amp;R)	Ctrl+Shift+Z</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Cu&amp;t	Ctrl+X</source>
-        <translation>切り取り(&amp;T)	Ctrl+X</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Copy	Ctrl+C</source>
-        <translation>コピー(&amp;C)	Ctrl+C</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Paste	Ctrl+V</source>
-        <translation>貼り付け(&amp;P)	Ctrl+V</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
@@ -1522,21 +1577,6 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;View</source>
-        <translation>表示(&amp;V)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Toolbar</source>
-        <translation>ツールバー(&amp;T)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Status Bar</source>
-        <translation>ステータスバー(&amp;S)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Zoom &amp;In	Ctrl++</source>
         <translation>拡大(&amp;I)	Ctrl++</translation>
     </message>
@@ -1549,51 +1589,6 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>&amp;Usual Size	Ctrl+0</source>
         <translation>標準サイズ(&amp;U)	Ctrl+0</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Window</source>
-        <translation>ウィンドウ(&amp;W)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;New Window</source>
-        <translation>新しいウィンドウ(&amp;N)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Cascade</source>
-        <translation>重ねて表示(&amp;C)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Tile Horizontally</source>
-        <translation>上下に並べて表示(&amp;T)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Tile Vertically</source>
-        <translation>左右に並べて表示</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Arrange Icons</source>
-        <translation>アイコンの整列(&amp;A)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Help</source>
-        <translation>ヘルプ(&amp;H)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Help	F1</source>
-        <translation>ヘルプ(&amp;H)	F1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;About...</source>
-        <translation>バージョン情報(&amp;A)...</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>

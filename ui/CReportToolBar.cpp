@@ -9,27 +9,38 @@
 
 CReportToolBar::CReportToolBar(kareport::CommandTarget *owner, QWidget *parent) : QToolBar(parent), owner_(owner)
 {
-    setIconSize(QSize(16, 16));
     setMovable(false);
     setFloatable(false);
     setToolButtonStyle(Qt::ToolButtonIconOnly);
     setWindowTitle(Xlate("Report"));
-    for (const unsigned id : {kareport::commandSaveReport, kareport::commandShowReport, kareport::commandPrintReport}) {
-        QAction *button = addAction(kareport::reportIcon(id), QString());
-        button->setData(id);
-        QString tip;
-        OnUserToolTip(button, tip);
-        button->setText(tip);
-        button->setToolTip(tip);
-        connect(button, &QAction::triggered, this, [this, id] {
-            if (kareport::CommandTarget *asked = target()) {
-                asked->runCommand(id);
-            }
-        });
-        // A person without a mouse reaches the buttons with the Tab key.
-        widgetForAction(button)->setFocusPolicy(Qt::TabFocus);
-        widgetForAction(button)->setAccessibleName(tip);
+    const kareport::ToolBarResource bar = kareport::reportBar(kareport::reportToolBar);
+    setIconSize(bar.buttonSize);
+    for (const unsigned id : bar.commands) {
+        addButton(id);
     }
+}
+
+int CReportToolBar::GetDlgCtrlID() const
+{
+    return static_cast<int>(kareport::reportToolBar);
+}
+
+void CReportToolBar::addButton(unsigned id)
+{
+    QAction *button = addAction(kareport::reportIcon(id), QString());
+    button->setData(id);
+    QString tip;
+    OnUserToolTip(button, tip);
+    button->setText(tip);
+    button->setToolTip(tip);
+    connect(button, &QAction::triggered, this, [this, id] {
+        if (kareport::CommandTarget *asked = target()) {
+            asked->runCommand(id);
+        }
+    });
+    // A person without a mouse reaches the buttons with the Tab key.
+    widgetForAction(button)->setFocusPolicy(Qt::TabFocus);
+    widgetForAction(button)->setAccessibleName(tip);
 }
 
 bool CReportToolBar::OnShowControlBarMenu(const QPoint & /*point*/) const

@@ -21,6 +21,9 @@ public:
     /// parent, where it handles commands
     explicit CReportToolBar(kareport::CommandTarget *owner, QWidget *parent = nullptr);
 
+    /// The number of the bar, by which its window knows it.
+    int GetDlgCtrlID() const;
+
     /// The bar docks at once, without markers of the places where it could.
     DockingMode GetDockingMode() const { return DockImmediately; }
     /// No menu of bars is shown. @return false
@@ -36,6 +39,8 @@ protected:
 
 private:
     kareport::CommandTarget *target() const;
+
+    void addButton(unsigned id);
 
     kareport::CommandTarget *owner_;
 };

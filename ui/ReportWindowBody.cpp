@@ -1,6 +1,7 @@
 #include "ReportWindowBody.h"
 
 #include "CReportToolBar.h"
+#include "ReportResources.h"
 #include "UReportList.h"
 #include "UReportWindowDlg.h"
 
@@ -16,14 +17,15 @@ namespace
 
 /// How often the buttons follow the state of the report.
 constexpr int updateInterval = 200; // milliseconds
-/// The size of the dialog in its own units: quarters of an average character and eighths of a line.
-constexpr QSize dialogUnits{220, 89};
 
 } // namespace
 
 ReportWindowBody::ReportWindowBody(UReportWindowDlg *window)
     : window_(window), toolBar_(new CReportToolBar(window, this)), list_(new UReportList(this))
 {
+    const DialogResource dialog = reportDialog(reportWindowDialog);
+    setFont(dialog.font());
+    list_->Create(this, pixelsOfDialogUnits(dialog.controlPlace, fontMetrics()), static_cast<int>(dialog.control));
     // Whatever in the window has the keyboard, the window sees its keys first.
     list_->installEventFilter(this);
     toolBar_->installEventFilter(this);
@@ -58,8 +60,7 @@ void ReportWindowBody::updateCommands()
 
 QSize ReportWindowBody::sizeHint() const
 {
-    const QFontMetrics metrics = fontMetrics();
-    return {dialogUnits.width() * metrics.averageCharWidth() / 4, dialogUnits.height() * metrics.height() / 8};
+    return pixelsOfDialogUnits(QRect(QPoint(), reportDialog(reportWindowDialog).size), fontMetrics()).size();
 }
 
 bool ReportWindowBody::eventFilter(QObject *watched, QEvent *event)

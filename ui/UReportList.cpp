@@ -1,7 +1,10 @@
 #include "UReportList.h"
 
 #include "ReportLines.h"
+#include "ReportResources.h"
 
+#include <QClipboard>
+#include <QGuiApplication>
 #include <QKeyEvent>
 #include <QScrollBar>
 
@@ -12,9 +15,6 @@ namespace
 
 /// How long lines wait for others that come with them.
 constexpr int flushInterval = 50; // milliseconds
-/// The face and size of a list that has been given no font.
-const QString dialogFace = QStringLiteral("MS Shell Dlg");
-constexpr int dialogPoints = 8;
 
 /// The sides of a rectangle that lie outside it, as its right and bottom one count here.
 int rightOf(const QRect &rect)
@@ -69,7 +69,7 @@ bool UReportList::Create(QWidget *parent, const QRect &rect, int id)
     }
     setParent(parent);
     if (!testAttribute(Qt::WA_SetFont)) {
-        setFont(QFont(dialogFace, dialogPoints));
+        setFont(kareport::reportDialog(kareport::reportWindowDialog).font());
     }
     setFrameStyle(QFrame::StyledPanel | QFrame::Sunken);
     setGeometry(rect);
@@ -111,6 +111,13 @@ QString UReportList::GetText(int row) const
 int UReportList::GetCurSel() const
 {
     return newest_ >= 0 ? newest_ : currentIndex().row();
+}
+
+void UReportList::CopyLine() const
+{
+    if (GetCurSel() >= 0) {
+        QGuiApplication::clipboard()->setText(GetText(GetCurSel()));
+    }
 }
 
 void UReportList::flush()

@@ -51,6 +51,8 @@ public:
     QString GetText(int row) const;
     /// The current row; −1 for none.
     int GetCurSel() const;
+    /// Puts the current line on the clipboard, as it was added; nothing without one.
+    void CopyLine() const;
     /// The width of the widest line so far, in pixels.
     int GetHorizontalExtent() const { return extent_; }
 

@@ -4,6 +4,7 @@
 #include "ReportContent.h"
 #include "ReportResources.h"
 #include "ReportWindowBody.h"
+#include "ReportWindowCommands.h"
 #include "UReportDoc.h"
 #include "UReportList.h"
 #include "UView.h"
@@ -51,7 +52,8 @@ UReportWindowDlg::UReportWindowDlg()
            [this](kareport::CommandState &state) { OnUpdateSave(state); }},
           {kareport::commandPrintReport, [this] { OnPrint(); },
            [this](kareport::CommandState &state) { OnUpdatePrint(state); }},
-      }
+      },
+      menuCommands_(std::make_unique<kareport::ReportWindowCommands>(*this))
 {}
 
 UReportWindowDlg::~UReportWindowDlg()
@@ -137,6 +139,16 @@ void UReportWindowDlg::OnSysCommand(unsigned command, long parameter)
     } else {
         CPropertyPane::OnSysCommand(command, parameter);
     }
+}
+
+UDocument *UReportWindowDlg::GetShownDocument() const
+{
+    return GetReportDoc();
+}
+
+kareport::CommandTarget *UReportWindowDlg::GetCommandTarget()
+{
+    return menuCommands_.get();
 }
 
 bool UReportWindowDlg::PreTranslateMessage(QEvent *event)
@@ -228,9 +240,6 @@ void UReportWindowDlg::takeFocus()
 {
     if (body_) {
         BringToTop();
-        if (GetDock()->isFloating()) {
-            GetDock()->activateWindow();
-        }
     }
 }
 

@@ -8,15 +8,22 @@
 
 #include <QPointer>
 
+#include <memory>
+
 class CReportToolBar;
 class QEvent;
 class UReportDoc;
 class UReportList;
+class UReportView;
 
 namespace kareport
 {
 class ReportWindowBody;
-}
+class ReportWindowCommands;
+
+/// The first view of a report that shows its text; null for none.
+UReportView *firstReportView(const UReportDoc &report);
+} // namespace kareport
 
 /// The report window: a pane at the bottom of the main frame that shows the lines of a report as they are written, with
 /// buttons to save it, to open it in its own view and to print it once it is marked active.
@@ -51,6 +58,10 @@ public:
     /// The window never stands among the documents as a tab.
     bool CanBeTabbedDocument() const override { return false; }
     CViewPane *GetOwningPane() override { return isCreated() ? this : nullptr; }
+    UDocument *GetShownDocument() const override;
+    /// Lets the commands of a report's menus act on the report of the window while it has the keyboard. What cannot be done
+    /// with its lines is disabled.
+    kareport::CommandTarget *GetCommandTarget() override;
     /// Ends what the previous view is in the middle of when the Escape key comes, pressed or released, to whatever in the
     /// window has the keyboard. @return whether it did, and the key is used up
     bool PreTranslateMessage(QEvent *event);
@@ -104,6 +115,7 @@ private:
 
     QPointer<kareport::ReportWindowBody> body_; ///< null while the window is not created
     std::vector<kareport::Command> commands_;
+    std::unique_ptr<kareport::ReportWindowCommands> menuCommands_;
     UReportDoc *report_ = nullptr; ///< may have gone
     kareport::RememberedView previousView_;
     bool active_ = false;

@@ -11,10 +11,7 @@
 
 #include <algorithm>
 
-namespace
-{
-
-UReportView *firstReportView(const UReportDoc &report)
+UReportView *kareport::firstReportView(const UReportDoc &report)
 {
     for (UView *view : report.GetViews()) {
         if (auto *reportView = dynamic_cast<UReportView *>(view)) {
@@ -23,6 +20,9 @@ UReportView *firstReportView(const UReportDoc &report)
     }
     return nullptr;
 }
+
+namespace
+{
 
 /// Closes the panes of a report that were never shown: it now stands in one that is.
 void closeHiddenPanes(const UReportDoc &report, const CViewPane *shown)
@@ -107,7 +107,7 @@ void UReportWindowDlg::OnPrint()
     }
     report->UpdateAllViews(nullptr, 0, nullptr);
     // Views that are updated, and the user who prints, may close the report, and this window with it.
-    UReportView *view = UReportDoc::IsReportAvailable(report) ? firstReportView(*report) : nullptr;
+    UReportView *view = UReportDoc::IsReportAvailable(report) ? kareport::firstReportView(*report) : nullptr;
     if (view != nullptr) {
         view->UpdateData(true);
         view->OnReportPrint();

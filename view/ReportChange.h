@@ -8,11 +8,9 @@ namespace kareport
 {
 
 /// What one edit has replaced in the text of a view. A line end counts as one character here; in the document it is two,
-/// CR LF. Other views of the document are updated with `hint` and a pointer to the change, and apply it.
+/// CR LF.
 struct ReportChange
 {
-    static constexpr long hint = 1;
-
     int position = 0;
     int removed = 0;
     QString inserted;        ///< its lines end with LF

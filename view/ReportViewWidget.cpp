@@ -11,6 +11,7 @@
 #include <QLabel>
 #include <QLineEdit>
 #include <QScrollBar>
+#include <QShowEvent>
 #include <QTextBlock>
 #include <QVBoxLayout>
 
@@ -213,6 +214,14 @@ void ReportViewWidget::keyPressEvent(QKeyEvent *event)
         return;
     }
     QWidget::keyPressEvent(event);
+}
+
+void ReportViewWidget::showEvent(QShowEvent *event)
+{
+    if (!event->spontaneous() && shown_) {
+        shown_();
+    }
+    QWidget::showEvent(event);
 }
 
 bool ReportViewWidget::eventFilter(QObject *watched, QEvent *event)

@@ -37,6 +37,8 @@ public:
     void setLinesPerPage(std::function<int()> linesPerPage);
     /// Called when the mouse is pressed anywhere in it.
     void setPressHandler(std::function<void()> handler) { pressed_ = std::move(handler); }
+    /// Called when the window comes to be seen after it was hidden.
+    void setShowHandler(std::function<void()> handler) { shown_ = std::move(handler); }
 
     void openFindBar();
     void openPageBar();
@@ -54,6 +56,7 @@ public:
 protected:
     bool event(QEvent *event) override;
     void keyPressEvent(QKeyEvent *event) override;
+    void showEvent(QShowEvent *event) override;
     bool eventFilter(QObject *watched, QEvent *event) override;
 
 private:
@@ -76,6 +79,7 @@ private:
     QTimer placeTimer_; ///< shows the place anew
     std::function<int()> linesPerPage_;
     std::function<void()> pressed_;
+    std::function<void()> shown_;
 };
 
 } // namespace kareport

@@ -1,9 +1,11 @@
 #include "UReportView.h"
 
+#include "COneViewPane.h"
 #include "PrintRun.h"
 #include "ReportChange.h"
 #include "ReportContent.h"
 #include "ReportEdit.h"
+#include "ReportEntry.h"
 #include "ReportViewWidget.h"
 #include "RichTextWriter.h"
 #include "SingleByteText.h"
@@ -35,6 +37,7 @@ UReportView::UReportView()
     edit_ = &widget->edit();
     widget->setLinesPerPage([this] { return GetDocument() != nullptr ? GetDocument()->GetLinesPerPage() : 0; });
     widget->setPressHandler([this] { OnMouseActivate(); });
+    widget->setShowHandler([this] { loadIfStale(); });
     edit_->setFocusHandler([this] { OnSetFocus(); });
     edit_->setEditHandler([this](const ReportChange &change) { takeEdit(change); });
     commands_ = makeCommands();
@@ -54,6 +57,7 @@ UReportView::~UReportView()
         edit_->setLoadHandler({});
         edit_->stopLoading();
         widget->setPressHandler({});
+        widget->setShowHandler({});
         widget->setLinesPerPage({});
         widget->hide();
         widget->setParent(nullptr);
@@ -97,8 +101,9 @@ void UReportView::OnUpdate(UView *sender, long hint, void *hintObject)
     if (!widget_) {
         return; // the window has gone before its view, as it does with a frame that closes
     }
-    if (hint == ReportChange::hint && hintObject != nullptr && dynamic_cast<UReportView *>(sender) != nullptr) {
-        followEdit(*static_cast<const ReportChange *>(hintObject));
+    const auto *edited = hint == 0 && hintObject == nullptr ? dynamic_cast<const UReportView *>(sender) : nullptr;
+    if (edited != nullptr && edited->toldChange_ != nullptr) {
+        followEdit(*edited->toldChange_);
         return;
     }
     m_nWordWrap = WrapNone;
@@ -136,6 +141,27 @@ void UReportView::UpdateData(bool toView)
     if (!report->GetRTFDataFlag() && wrap == WrapNone) {
         noteMirrored();
     }
+    noteLoaded();
+}
+
+void UReportView::noteLoaded()
+{
+    loadedLength_ = GetDocument()->GetTextLength();
+    mirroredEdits_ = GetDocument()->GetEditCount();
+}
+
+void UReportView::loadIfStale()
+{
+    // A pane that was hidden while its report was written shows another text than the report's: an edit of that would take
+    // the report's place.
+    if (GetDocument() != nullptr && isStale()) {
+        OnUpdate(nullptr, 0, nullptr);
+    }
+}
+
+bool UReportView::isStale() const
+{
+    return GetDocument()->GetTextLength() != loadedLength_ || GetDocument()->GetEditCount() != mirroredEdits_;
 }
 
 bool UReportView::loadInPieces()
@@ -148,17 +174,19 @@ bool UReportView::loadInPieces()
     }
     isMirrored_ = false;
     showsFormats_ = false;
+    noteLoaded();
     // What a host appends meanwhile is shown with its next update. Any other change begins the load anew.
     const quint64 edits = report->GetEditCount();
     const auto read = [report, edits](qint64 at, qint64 count) {
         const bool isSame = UReportDoc::IsReportAvailable(report) && report->GetEditCount() == edits;
         return isSame ? report->CopyText(at, count) : QString();
     };
-    edit_->loadPlainTextInPieces({report->GetTextLength(), read}, [this, edits] {
+    edit_->loadPlainTextInPieces({report->GetTextLength(), read}, [this, edits, length = report->GetTextLength()] {
         if (GetDocument() != nullptr && GetDocument()->GetEditCount() != edits) {
             OnUpdate(nullptr, 0, nullptr);
         } else {
             noteMirrored();
+            loadedLength_ = length;
         }
     });
     return true;
@@ -170,7 +198,7 @@ void UReportView::noteMirrored()
     // are as long there as here.
     const UReportDoc *report = GetDocument();
     isMirrored_ = report->GetTextLength() == edit_->windowTextLength();
-    mirroredEdits_ = report->GetEditCount();
+    noteLoaded();
 }
 
 void UReportView::SetRTFText(const QString &text)
@@ -218,12 +246,20 @@ void UReportView::takeEdit(const ReportChange &change)
         report->SetModifiedFlag(true);
     }
     noteMirrored();
-    ReportChange handedOn = change;
-    report->UpdateAllViews(this, ReportChange::hint, &handedOn);
+    const std::weak_ptr<UView *const> self = GetHandle();
+    toldChange_ = &change;
+    report->UpdateAllViews(this, 0, nullptr);
+    if (const auto handle = self.lock(); handle && *handle == this) { // an editor that took it may have closed it
+        toldChange_ = nullptr;
+    }
 }
 
 void UReportView::followEdit(const ReportChange &change)
 {
+    const UReportDoc *report = GetDocument();
+    if (report == nullptr || (isMirrored_ && !isStale())) {
+        return; // it has followed already, in a view that was told of the same edit twice
+    }
     // A view that shows formats, or an image, shows another text than the one that was edited: what the document holds now
     // is plain.
     if (!showsFormats_ && edit_->applyChange(change)) {
@@ -263,13 +299,19 @@ void UReportView::OnMouseActivate()
     if (frame == nullptr || ancestor != frame) {
         return;
     }
-    const QWidget *focus = QApplication::focusWidget();
-    const bool hasFocus = focus != nullptr && (focus == widget_ || widget_->isAncestorOf(focus));
-    if (frame->GetActiveView() != this) {
+    UView *active = frame->GetActiveView();
+    if (active != this) {
         frame->SetActiveViewForFrameAndPane(this);
+        OnActivateView(true, this, active);
+        return;
     }
-    if (!hasFocus) {
-        edit_->setFocus(Qt::MouseFocusReason);
+    const QWidget *focus = QApplication::focusWidget();
+    if (focus == nullptr || (focus != widget_ && !widget_->isAncestorOf(focus))) {
+        const CViewPane *pane = frame->GetActivePane();
+        if (pane != GetParentPane()) {
+            frame->SetActiveViewForFrameAndPane(this); // a pane without a view had the keyboard
+        }
+        OnActivateView(true, this, this);
     }
 }
 
@@ -286,8 +328,9 @@ void UReportView::OnReportExit()
     if (report != nullptr && report->GetReportWindow() != nullptr) {
         report->SetCloseDocument(1);
     }
-    if (UXTPMDIFrameWnd *frame = UXTPMDIFrameWnd::Get()) {
-        frame->close();
+    UXTPMDIFrameWnd *frame = UXTPMDIFrameWnd::Get();
+    if (frame != nullptr && !frame->close()) {
+        kareport::noteExitCancelled();
     }
 }
 

@@ -131,6 +131,9 @@ private:
     std::vector<kareport::Command> makeCommands();
     void takeEdit(const kareport::ReportChange &change);
     void followEdit(const kareport::ReportChange &change);
+    void noteLoaded();
+    void loadIfStale();
+    bool isStale() const; ///< whether the document has changed since, and the view was not told
 
     QPointer<QWidget> widget_;
     kareport::ReportEdit *edit_ = nullptr; ///< owned by the widget
@@ -138,7 +141,10 @@ private:
     WordWrap m_nWordWrap = WrapNone;
     bool loadsInPieces_ = false;
     bool isMirrored_ = false;   ///< whether the document holds the control's text, its lines ended by CR LF
+    qint64 loadedLength_ = -1;  ///< the document's length when the control was loaded from it or it from the control
     quint64 mirroredEdits_ = 0; ///< the document's edits by then
+    /// What other views are being told of: they take it over instead of the whole text. Null while nothing is told.
+    const kareport::ReportChange *toldChange_ = nullptr;
     bool showsFormats_ = false; ///< whether the control's text was rich text
     QMargins m_rectMargin;      ///< twips
     QSize m_sizePaper;          ///< twips

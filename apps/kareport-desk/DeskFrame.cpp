@@ -6,16 +6,15 @@
 #include "PdfFile.h"
 #include "PreferencesDialog.h"
 #include "ReportEntry.h"
+#include "ReportResources.h"
 #include "ReportSaveName.h"
 #include "SavedReports.h"
 #include "TemplateDialog.h"
 #include "UApplication.h"
 #include "UReportDoc.h"
-#include "UReportWindowDlg.h"
 #include "UView.h"
 #include "Xlate.h"
 
-#include <QApplication>
 #include <QCloseEvent>
 #include <QDir>
 #include <QDragEnterEvent>
@@ -49,31 +48,12 @@ UDocument *documentOf(const QString &path)
     return nullptr;
 }
 
-/// Closes reports that nobody can see or close any more, as after their window was closed. What an editor outside holds is
-/// hidden on purpose.
-void closeUnseen()
-{
-    for (UDocument *document : openDocuments()) {
-        auto *report = isOpen(document) ? dynamic_cast<UReportDoc *>(document) : nullptr;
-        // A document that must not delete itself is in the middle of being opened.
-        if (report == nullptr || report->GetExternalEditorFlag() || report->IsShown() || !report->IsAutoDelete()) {
-            continue;
-        }
-        const auto *window = dynamic_cast<UReportWindowDlg *>(report->GetReportWindow());
-        if (!report->IsModified() || (window != nullptr && window->IsGivenUp())) {
-            report->OnCloseDocument();
-        } else if (CViewPane *pane = report->GetFrameWindow()) {
-            pane->ShowPane(true); // what is not saved is not thrown away: closing this pane asks again
-        }
-    }
-}
-
 } // namespace
 
 DeskFrame::DeskFrame() : files_([this](const QString &path) { fileChanged(path); })
 {
     commands_ = makeCommands();
-    setWindowTitle(Xlate("KaReport"));
+    setWindowTitle(Xlate(kareport::reportString(kareport::moduleTitle)));
     setAcceptDrops(true);
     constexpr QSize usualSize(1000, 760);
     resize(usualSize);
@@ -97,10 +77,7 @@ DeskFrame::DeskFrame() : files_([this](const QString &path) { fileChanged(path);
     UpdateCommands();
     constexpr int lookInterval = 500; // milliseconds
     auto *looking = new QTimer(this);
-    connect(looking, &QTimer::timeout, this, [this] {
-        closeUnseen();
-        activateSomeView();
-    });
+    connect(looking, &QTimer::timeout, this, [this] { closeUnseen(); });
     looking->start(lookInterval);
     constexpr int keepInterval = 5000; // milliseconds
     auto *timer = new QTimer(this);
@@ -110,47 +87,10 @@ DeskFrame::DeskFrame() : files_([this](const QString &path) { fileChanged(path);
 
 DeskFrame::~DeskFrame() = default;
 
-UDocument *DeskFrame::activeDocument() const
-{
-    return GetActiveView() != nullptr ? GetActiveView()->GetDocument() : nullptr;
-}
-
 void DeskFrame::newReport()
 {
     if (UReportDoc *report = CreateReport(Xlate("Report"), true, false, nullptr, 0, nullptr)) {
         activate(report);
-    }
-}
-
-void DeskFrame::activate(UDocument *report)
-{
-    UApplication::Get()->SetCurrentReport(report);
-    if (!report->GetViews().empty()) {
-        SetActiveViewForFrameAndPane(report->GetViews().front());
-    }
-}
-
-void DeskFrame::activateSomeView()
-{
-    // Commands are for the view with the keyboard: another window of the same report, or the only one that is left.
-    const QWidget *focus = QApplication::focusWidget();
-    UView *last = nullptr;
-    for (const UDocument *document : openDocuments()) {
-        for (UView *view : document->GetViews()) {
-            if (!view->IsVisible() || view->GetWidget() == nullptr) {
-                continue;
-            }
-            const bool hasFocus = focus != nullptr && view->GetWidget()->isAncestorOf(focus);
-            if (hasFocus && view != GetActiveView()) {
-                SetActiveViewForFrameAndPane(view);
-                return;
-            }
-            last = view;
-        }
-    }
-    if (GetActiveView() == nullptr && last != nullptr) {
-        UApplication::Get()->SetCurrentReport(last->GetDocument());
-        SetActiveViewForFrameAndPane(last);
     }
 }
 
@@ -217,10 +157,7 @@ bool DeskFrame::OpenFile(const QString &path)
     } else {
         const QString file = QDir::cleanPath(QFileInfo(path).absoluteFilePath());
         report = documentOf(file);
-        if (report != nullptr && !report->GetViews().empty() && report->GetViews().front()->GetParentPane() != nullptr)
-        {
-            report->GetViews().front()->GetParentPane()->ShowPane(true); // it is open already
-        } else {
+        if (report == nullptr) {
             report = kareport::openSavedReport(file);
         }
         error = report == nullptr ? Xlate("\"%1\" could not be opened.").arg(path) : QString();
@@ -331,11 +268,13 @@ void DeskFrame::closeEvent(QCloseEvent *event)
 {
     if (kareport::isJobRunning()) {
         event->ignore();
+        kareport::noteExitCancelled();
         return;
     }
     for (UDocument *document : openDocuments()) {
         if (isOpen(document) && !document->SaveModified()) {
             event->ignore();
+            kareport::noteExitCancelled();
             return;
         }
     }

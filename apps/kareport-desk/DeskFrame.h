@@ -44,6 +44,7 @@ public:
     std::function<std::optional<kareport::TemplateJob>(const QString &templateFile)> askTemplate;
 
 protected:
+    void SettlePanes() override;
     void closeEvent(QCloseEvent *event) override;
     void dragEnterEvent(QDragEnterEvent *event) override;
     void dropEvent(QDropEvent *event) override;
@@ -53,14 +54,16 @@ private:
     void makeMenus();
     void fillRecentFiles();
 
-    UDocument *activeDocument() const;
     void newReport();
     void open();
     void fromTemplate(const QString &templateFile);
     void askPreferences();
     bool finishOpening(UDocument *report, const QString &error);
+    /// Brings a report to the front where it is shown, and shows it where it is not.
     void activate(UDocument *report);
-    void activateSomeView();
+    /// Closes reports that nobody can see or close any more, as after their window was closed. One that has changes is shown
+    /// again, and so is one whose editor has been closed.
+    void closeUnseen();
     void fileChanged(const QString &path);
 
     void newWindow();

@@ -1,10 +1,16 @@
 #include "DeskFrame.h"
 
 #include "COneViewPane.h"
+#include "JobLauncher.h"
 #include "PaneDock.h"
 #include "Profile.h"
 #include "ReportEntry.h"
+#include "UApplication.h"
+#include "UReportDoc.h"
+#include "UReportWindowDlg.h"
+#include "UView.h"
 
+#include <QApplication>
 #include <QDockWidget>
 
 namespace
@@ -13,11 +19,71 @@ namespace
 const QString layoutEntry = QStringLiteral("Window Layout");
 const QString geometryEntry = QStringLiteral("Window Geometry");
 
+/// The pane of the window that shows a report while it is written; null without one.
+CViewPane *reportWindowPane(const UDocument &document)
+{
+    const auto *report = dynamic_cast<const UReportDoc *>(&document);
+    return report != nullptr && report->GetReportWindow() != nullptr ? report->GetReportWindow()->GetOwningPane()
+                                                                     : nullptr;
+}
+
+/// Whether a report is the rich text that was made of another one for a word processor. Its text is the other's.
+bool isCopyForWordProcessor(const UReportDoc &report)
+{
+    return report.GetRTFDataFlag() && report.GetTitle().isEmpty() && !report.IsModified();
+}
+
 } // namespace
+
+void DeskFrame::activate(UDocument *report)
+{
+    UApplication::Get()->SetCurrentReport(report);
+    for (UView *view : report->GetViews()) {
+        if (view->IsVisible()) {
+            SetActiveViewForFrameAndPane(view);
+            return;
+        }
+    }
+    // The view of a report that is shown in a report window stays hidden.
+    if (CViewPane *window = reportWindowPane(*report); window != nullptr && window->IsVisible()) {
+        window->BringToTop();
+    } else if (!report->GetViews().empty() && report->GetViews().front()->GetParentPane() != nullptr) {
+        report->GetViews().front()->GetParentPane()->ShowPane(true);
+    }
+}
+
+void DeskFrame::closeUnseen()
+{
+    // Whoever has opened a dialog may still need the report that it is about.
+    if (QApplication::activeModalWidget() != nullptr || kareport::isJobRunning()) {
+        return;
+    }
+    for (UDocument *document : UApplication::Get()->GetDocuments()) {
+        auto *report = UApplication::Get()->IsOpen(document) ? dynamic_cast<UReportDoc *>(document) : nullptr;
+        // A document that must not delete itself is in the middle of being opened.
+        if (report == nullptr || report->IsShown() || !report->IsAutoDelete() || editors_.holds(*report)) {
+            continue;
+        }
+        const auto *window = dynamic_cast<UReportWindowDlg *>(report->GetReportWindow());
+        const bool isGivenUp = window != nullptr && window->IsGivenUp();
+        const bool wasEdited = report->GetExternalEditorFlag() && !isCopyForWordProcessor(*report);
+        if (isGivenUp || (!report->IsModified() && !wasEdited)) {
+            report->OnCloseDocument();
+        } else if (CViewPane *pane = report->GetFrameWindow()) {
+            pane->ShowPane(true); // what is not saved is not thrown away: closing this pane asks again
+        }
+    }
+}
+
+void DeskFrame::SettlePanes()
+{
+    closeUnseen();
+    UXTPMDIFrameWnd::SettlePanes();
+}
 
 void DeskFrame::newWindow()
 {
-    UDocument *document = activeDocument();
+    UDocument *document = GetCommandDocument();
     if (document == nullptr) {
         return;
     }

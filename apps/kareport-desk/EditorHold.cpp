@@ -17,18 +17,6 @@ namespace kareport
 namespace
 {
 constexpr int lookInterval = 500; // milliseconds
-
-/// Shows a report that an editor does not show.
-void showInstead(UReportDoc *report, const QString &program)
-{
-    if (UReportDoc::IsReportAvailable(report)) {
-        report->SetExternalEditorFlag(false);
-        report->SetModifiedFlag(true); // it is saved nowhere but in a temporary file
-        report->UpdateAllViews(nullptr, 0, nullptr);
-    }
-    AppMessageBox(Xlate("\"%1\" could not be started. Choose another program under Preferences.").arg(program));
-}
-
 } // namespace
 
 EditorHold::EditorHold()
@@ -48,14 +36,37 @@ void EditorHold::start(const EditorLaunch &launch)
     qint64 process = 0;
     auto *report = dynamic_cast<UReportDoc *>(launch.document);
     if (!QProcess::startDetached(launch.program, {launch.file}, launch.folder, &process)) {
-        QTimer::singleShot(0, &timer_, [report, program = launch.program] { showInstead(report, program); });
+        unstarted_.push_back(report);
+        QTimer::singleShot(0, &timer_, [this, report, program = launch.program] { showInstead(report, program); });
         return;
     }
-    if (report != nullptr && loadPreferences().keepsForEditor) {
-        report->EnableCloseOption(false);
-        held_.push_back({report, process});
+    if (report != nullptr) {
+        const bool isKept = loadPreferences().keepsForEditor;
+        if (isKept) {
+            report->EnableCloseOption(false);
+        }
+        held_.push_back({report, process, isKept});
         timer_.start();
     }
+}
+
+void EditorHold::showInstead(UReportDoc *report, const QString &program)
+{
+    std::erase(unstarted_, report);
+    if (UReportDoc::IsReportAvailable(report)) {
+        report->SetExternalEditorFlag(false);
+        report->SetModifiedFlag(true); // it is saved nowhere but in a temporary file
+        report->UpdateAllViews(nullptr, 0, nullptr);
+    }
+    AppMessageBox(Xlate("\"%1\" could not be started. Choose another program under Preferences.").arg(program));
+}
+
+bool EditorHold::holds(const UReportDoc &report) const
+{
+    const auto isOfReport = [&report](const Held &held) { return held.report == &report; };
+    const bool isCopied = report.GetExternalEditorFlag() && !report.IsModified();
+    return std::any_of(held_.begin(), held_.end(), isOfReport) || (isCopied && !held_.empty()) ||
+           std::find(unstarted_.begin(), unstarted_.end(), &report) != unstarted_.end();
 }
 
 void EditorHold::look()
@@ -67,9 +78,10 @@ void EditorHold::look()
     held_.erase(ended, held_.end());
     for (const Held &held : released) {
         // Another editor may still hold it.
-        const bool isHeld =
-            std::any_of(held_.begin(), held_.end(), [&held](const Held &other) { return other.report == held.report; });
-        if (!isHeld && UReportDoc::IsReportAvailable(held.report)) {
+        const bool isHeld = std::any_of(held_.begin(), held_.end(), [&held](const Held &other) {
+            return other.report == held.report && other.isKept;
+        });
+        if (held.isKept && !isHeld && UReportDoc::IsReportAvailable(held.report)) {
             held.report->EnableCloseOption(true);
         }
     }

@@ -8,6 +8,7 @@
 #include <Profile.h>
 #include <ReportEntry.h>
 #include <ReportInitialTemplate.h>
+#include <ReportMenu.h>
 #include <ReportWindowEntry.h>
 #include <SaveDialog.h>
 #include <UApplication.h>
@@ -91,9 +92,8 @@ class Frame : public UXTPMDIFrameWnd
 public:
     Frame()
     {
-        QMenu *menu = menuBar()->addMenu(QStringLiteral("&File"));
-        AddCommand(*menu, 57604, QStringLiteral("Save &As...\tCtrl+Shift+S")); // handled by the report's view
-        AddCommand(*menu, 57607, QStringLiteral("&Print...\tCtrl+P"));
+        const kareport::ReportMenu menu = kareport::addReportMenu(*this, *menuBar()); // handled by the report's view
+        AddCommand(*menu.edit, 57636, QStringLiteral("&Find...\tCtrl+F"));
         kareport::setMessageBox(
             [this](const kareport::Message &message) { return kareport::showMessageBox(this, message); });
         kareport::setSaveDialog([this](const kareport::SaveRequest &request) -> std::optional<QString> {
@@ -109,6 +109,9 @@ protected:
     {
         for (UDocument *report : std::vector(GetReportTemplate()->GetDocuments())) {
             event->setAccepted(event->isAccepted() && report->SaveModified()); // the user may cancel
+        }
+        if (!event->isAccepted()) {
+            kareport::noteExitCancelled();
         }
     }
 };

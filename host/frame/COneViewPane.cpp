@@ -31,6 +31,9 @@ void COneViewPane::DropDock()
         dock_->deleteLater();
         dock_.clear();
     }
+    if (UXTPMDIFrameWnd *frame = UXTPMDIFrameWnd::Get()) {
+        frame->ForgetPane(*this);
+    }
 }
 
 QDockWidget *COneViewPane::GetDock() const
@@ -75,6 +78,11 @@ bool COneViewPane::IsVisible() const
     return dock_ && !dock_->isHidden();
 }
 
+bool COneViewPane::IsInFront() const
+{
+    return IsVisible() && !dock_->isBehindTab();
+}
+
 void COneViewPane::ShowPane(bool show)
 {
     if (dock_) {
@@ -87,11 +95,22 @@ void COneViewPane::ShowPane(bool show)
 
 void COneViewPane::BringToTop()
 {
-    if (dock_) {
-        dock_->raise();
-        if (dock_->widget() != nullptr) {
-            dock_->widget()->setFocus();
-        }
+    if (!IsVisible()) {
+        return;
+    }
+    dock_->raise();
+    if (UXTPMDIFrameWnd *frame = UXTPMDIFrameWnd::Get()) {
+        frame->ActivatePane(*this);
+    } else if (dock_->widget() != nullptr) {
+        dock_->widget()->setFocus();
+    }
+}
+
+void COneViewPane::DockShown(bool shown)
+{
+    CountAgain();
+    if (UXTPMDIFrameWnd *frame = UXTPMDIFrameWnd::Get(); frame != nullptr && !shown) {
+        frame->LeavePane(*this);
     }
 }
 

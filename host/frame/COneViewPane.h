@@ -33,7 +33,9 @@ public:
     void SetPlace(CViewPane *parent, unsigned style, const QRect *rect) override;
     void UpdateTitle() override;
     bool IsVisible() const override;
+    bool IsInFront() const override;
     void ShowPane(bool show) override;
+    /// Raises the pane, which becomes the active one of its frame and gets the keyboard; nothing while it is hidden.
     void BringToTop() override;
 
     /// A system command of the pane. Closing asks `CanClosePane`; other commands do nothing here.
@@ -54,5 +56,9 @@ protected:
     void DropDock();
 
 private:
+    friend class kareport::PaneDock;
+
+    void DockShown(bool shown);
+
     QPointer<kareport::PaneDock> dock_;
 };

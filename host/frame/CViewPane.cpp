@@ -69,7 +69,31 @@ void CViewPane::UpdateTitle() {}
 
 void CViewPane::ShowPane(bool show)
 {
+    const bool changes = visible_ != show;
     visible_ = show;
+    if (changes) {
+        CountAgain();
+    }
+}
+
+void CViewPane::CountAgain()
+{
+    std::vector<UDocument *> documents;
+    for (const auto &view : views_) {
+        UDocument *document = view->GetDocument();
+        if (document != nullptr && std::find(documents.begin(), documents.end(), document) == documents.end()) {
+            documents.push_back(document);
+        }
+    }
+    for (UDocument *document : documents) {
+        document->UpdateFrameCounts();
+    }
+}
+
+bool CViewPane::Shows(const UDocument *document) const
+{
+    return std::any_of(views_.begin(), views_.end(),
+                       [document](const auto &view) { return view->GetDocument() == document; });
 }
 
 void CViewPane::BringToTop() {}
@@ -90,21 +114,11 @@ void CViewPane::ClosePane()
     delete this;
 }
 
-void CViewPane::GetPaneTitles(QStringList &titles)
-{
-    titles.clear();
-    for (const CViewPane *pane : openPanes()) {
-        if (pane->HasDocumentTitle()) {
-            titles.append(pane->GetWindowTextW());
-        }
-    }
-}
-
-void CViewPane::GetPaneCaptions(QStringList &captions)
+void CViewPane::GetPaneCaptions(QStringList &captions, const UDocument *except)
 {
     captions.clear();
     for (const CViewPane *pane : openPanes()) {
-        if (pane->HasDocumentTitle()) {
+        if (pane->HasDocumentTitle() && (except == nullptr || !pane->Shows(except))) {
             captions.append(pane->GetCaption());
         }
     }

@@ -13,6 +13,11 @@
 class UDocument;
 class UView;
 
+namespace kareport
+{
+class CommandTarget;
+}
+
 /// A pane of the host's frame that shows views. Open panes are known to the application by their captions.
 class KAREPORT_EXPORT CViewPane
 {
@@ -31,8 +36,15 @@ public:
     virtual void SetPlace(CViewPane *parent, unsigned style, const QRect *rect);
     unsigned GetStyle() const { return style_; }
     const std::optional<QRect> &GetRect() const { return rect_; }
-    /// The document of the view that was put into the pane last, which it shows; null for a pane without one.
+    /// The view that was put into the pane last, which it shows; null for a pane without one.
+    UView *GetActiveView() const { return views_.empty() ? nullptr : views_.back().get(); }
+    /// The document of that view; null for a pane without one.
     UDocument *GetActiveDocument() const;
+    /// What the pane shows: the document of its view, or for a pane without one what stands in its body; null for nothing.
+    virtual UDocument *GetShownDocument() const { return GetActiveDocument(); }
+    /// Handles the frame's commands while the pane has the keyboard, before the active view does: a command that it knows
+    /// goes no further. Null leaves them all to the view.
+    virtual kareport::CommandTarget *GetCommandTarget() { return nullptr; }
 
     /// The pane's title without its number.
     virtual void SetWindowTextW(const QString &text);
@@ -42,12 +54,14 @@ public:
     /// Shows title and number again after one of them changed.
     virtual void UpdateTitle();
 
-    /// The number of the pane among those that show the same document: from 1, 0 for an only pane, −1 while panes are
-    /// being counted.
+    /// The number of the pane among those that show the same document: from 1, 0 for an only pane and for one that is
+    /// hidden, −1 while panes are being counted.
     int GetWindowNumber() const { return windowNumber_; }
     void SetWindowNumber(int number) { windowNumber_ = number; }
 
     virtual bool IsVisible() const { return visible_; }
+    /// Whether the user sees the pane: it is visible, and no tab of another stands before it.
+    virtual bool IsInFront() const { return IsVisible(); }
     virtual void ShowPane(bool show);
     /// Brings the pane's window to the front.
     virtual void BringToTop();
@@ -63,11 +77,16 @@ public:
     /// Whether a pointer is a pane that is open.
     static bool IsOpen(const CViewPane *pane);
     /// The captions of all open panes that have a document's title, in the order in which they were opened.
-    static void GetPaneCaptions(QStringList &captions);
-    /// The same without the numbers that panes of one document have.
-    static void GetPaneTitles(QStringList &titles);
+    /// @param except  a document whose panes do not count; null for none
+    static void GetPaneCaptions(QStringList &captions, const UDocument *except = nullptr);
+
+protected:
+    /// Numbers the panes of what is shown here again, after the pane was shown or hidden.
+    void CountAgain();
 
 private:
+    bool Shows(const UDocument *document) const;
+
     std::vector<std::unique_ptr<UView>> views_;
     QString text_;
     unsigned style_ = 0;

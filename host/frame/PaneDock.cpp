@@ -1,6 +1,7 @@
 #include "PaneDock.h"
 
 #include "COneViewPane.h"
+#include "UXTPMDIFrameWnd.h"
 
 #include <QAction>
 #include <QCloseEvent>
@@ -38,6 +39,12 @@ PaneDock::PaneDock(COneViewPane *pane) : pane_(pane)
     connect(this, &QDockWidget::topLevelChanged, this, &PaneDock::showCaption);
     // The frame is still in the middle of placing it.
     connect(this, &QDockWidget::dockLocationChanged, this, &PaneDock::standAlone, Qt::QueuedConnection);
+    // Whoever brings a pane back from the frame's list of panes wants to see it, also where it is one of several tabs.
+    connect(toggleViewAction(), &QAction::triggered, this, [this](bool shown) {
+        if (shown && pane_ != nullptr) {
+            pane_->BringToTop();
+        }
+    });
 }
 
 void PaneDock::setCaption(const QString &caption)
@@ -89,6 +96,42 @@ void PaneDock::standAlone()
     QMainWindow *frame = frameOf(*this);
     const Qt::DockWidgetArea area = frame->dockWidgetArea(this);
     frame->addDockWidget(area == Qt::NoDockWidgetArea ? Qt::BottomDockWidgetArea : area, this);
+}
+
+bool PaneDock::isBehindTab() const
+{
+    // The frame moves what stands behind a tab out of its sight and leaves it visible.
+    return !isWindow() && (geometry().right() < 0 || geometry().bottom() < 0);
+}
+
+void PaneDock::setVisible(bool visible)
+{
+    const bool wasHidden = isHidden();
+    QDockWidget::setVisible(visible);
+    if (pane_ != nullptr && isHidden() != wasHidden) {
+        pane_->DockShown(!isHidden());
+    }
+}
+
+void PaneDock::activatePane()
+{
+    UXTPMDIFrameWnd *frame = UXTPMDIFrameWnd::Get();
+    if (frame != nullptr && pane_ != nullptr && pane_->IsInFront()) {
+        frame->ActivatePane(*pane_);
+    }
+}
+
+bool PaneDock::event(QEvent *event)
+{
+    const QPointer<PaneDock> self(this);
+    const bool taken = QDockWidget::event(event);
+    // A press that nothing in the pane took, as on its title, and a window of its own that comes to the front.
+    const bool isPressed =
+        event->type() == QEvent::MouseButtonPress || event->type() == QEvent::NonClientAreaMouseButtonPress;
+    if (self && (isPressed || (event->type() == QEvent::WindowActivate && isWindow()))) {
+        activatePane();
+    }
+    return taken;
 }
 
 void PaneDock::closeEvent(QCloseEvent *event)

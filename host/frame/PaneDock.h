@@ -29,13 +29,19 @@ public:
     bool isTabbedAgainstItsWill() const;
     /// Leaves such a row for a place of its own in the same area.
     void standAlone();
+    /// Whether the tab of another dock widget stands before it.
+    bool isBehindTab() const;
+
+    void setVisible(bool visible) override;
 
 protected:
+    bool event(QEvent *event) override;
     void closeEvent(QCloseEvent *event) override;
     void paintEvent(QPaintEvent *event) override;
 
 private:
     void showCaption();
+    void activatePane();
 
     COneViewPane *pane_;
     QString caption_;

@@ -17,7 +17,7 @@ RememberedView RememberedView::active()
 
 bool RememberedView::bringToTop() const
 {
-    if (get() == nullptr || get()->GetParentPane() == nullptr) {
+    if (get() == nullptr || get()->GetParentPane() == nullptr || !get()->GetParentPane()->IsVisible()) {
         return false;
     }
     get()->GetParentPane()->BringToTop();

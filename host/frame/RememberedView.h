@@ -20,7 +20,7 @@ public:
 
     /// The view; null once it has gone.
     UView *get() const { return handle_ ? *handle_ : nullptr; }
-    /// Brings the view's pane to the front. @return false without a view or for one without a pane
+    /// Brings the view's pane to the front. @return false without a view and for one whose pane is hidden, or that has none
     bool bringToTop() const;
     /// Does that, and makes the view the active one of the main frame.
     void reactivate() const;

@@ -85,8 +85,13 @@ void UDocument::UpdateFrameCounts()
 {
     const auto visiblePane = [](const UView *view) { return view->IsVisible() ? view->GetParentPane() : nullptr; };
     for (const UView *view : views_) {
-        if (CViewPane *pane = visiblePane(view)) {
+        CViewPane *pane = view->GetParentPane();
+        if (visiblePane(view) != nullptr) {
             pane->SetWindowNumber(-1);
+        } else if (pane != nullptr && pane->GetWindowNumber() != 0) {
+            // Nobody sees it: it does not keep the document when the others are closed.
+            pane->SetWindowNumber(0);
+            pane->UpdateTitle();
         }
     }
     std::vector<CViewPane *> panes;

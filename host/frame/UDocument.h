@@ -49,7 +49,7 @@ public:
     void RemoveView(UView *view);
     /// Tells every view but the sender that the document has changed.
     virtual void UpdateAllViews(UView *sender, long hint = 0, void *hintObject = nullptr);
-    /// Numbers the panes that show the document.
+    /// Numbers the panes that show the document; hidden ones have the number 0.
     virtual void UpdateFrameCounts();
 
     /// Makes the document an unmodified one without a file, emptied by `DeleteContents`. @return false when that is not possible

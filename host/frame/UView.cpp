@@ -5,6 +5,8 @@
 #include "UDocument.h"
 #include "UXTPMDIFrameWnd.h"
 
+#include <QWidget>
+
 UView::UView() : handle_(std::make_shared<UView *>(this)) {}
 
 UView::~UView()
@@ -27,6 +29,18 @@ void UView::OnInitialUpdate()
 }
 
 void UView::OnUpdate(UView * /*sender*/, long /*hint*/, void * /*hintObject*/) {}
+
+void UView::OnActivateView(bool activate, UView *activated, UView * /*deactivated*/)
+{
+    QWidget *widget = GetWidget();
+    if (!activate || activated != this || widget == nullptr) {
+        return;
+    }
+    const QWidget *focus = widget->window()->focusWidget();
+    if (focus == nullptr || (focus != widget && !widget->isAncestorOf(focus))) {
+        widget->setFocus(Qt::OtherFocusReason);
+    }
+}
 
 bool UView::IsVisible() const
 {

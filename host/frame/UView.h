@@ -42,6 +42,11 @@ public:
     virtual void OnInitialUpdate();
     /// Called when the document has changed. The arguments are those of `UDocument::UpdateAllViews`.
     virtual void OnUpdate(UView *sender, long hint, void *hintObject);
+    /// Tells the view that it has become the active one, or is it no longer. A view that has become active takes the
+    /// keyboard, unless a part of it has it already.
+    /// @param activated, deactivated  the view that is active from now on and the one before: the same one when the view
+    ///                                only gets the keyboard back. Null for none
+    virtual void OnActivateView(bool activate, UView *activated, UView *deactivated);
     /// Whether the user can see the view.
     virtual bool IsVisible() const;
 

@@ -6,6 +6,7 @@
 #include "UView.h"
 
 #include <QAction>
+#include <QApplication>
 #include <QDockWidget>
 #include <QEvent>
 #include <QMenu>
@@ -37,10 +38,19 @@ UXTPMDIFrameWnd::UXTPMDIFrameWnd(QWidget *parent) : QMainWindow(parent)
     auto *timer = new QTimer(this);
     connect(timer, &QTimer::timeout, this, &UXTPMDIFrameWnd::UpdateCommands);
     timer->start(updateInterval);
+    connect(qApp, &QApplication::focusChanged, this, [this](QWidget *, const QWidget *now) { FollowKeyboard(now); });
+    connect(this, &QMainWindow::tabifiedDockWidgetActivated, this, [this](const QDockWidget *dock) {
+        if (COneViewPane *pane = PaneOf(dock); pane != nullptr && pane->IsInFront()) {
+            ActivatePane(*pane);
+        }
+    });
 }
 
 UXTPMDIFrameWnd::~UXTPMDIFrameWnd()
 {
+    // What stands in it goes after this: the keyboard that it loses is nobody's.
+    QObject::disconnect(qApp, nullptr, this, nullptr);
+    QObject::disconnect(this, &QMainWindow::tabifiedDockWidgetActivated, this, nullptr);
     if (theFrame() == this) {
         theFrame() = nullptr;
     }
@@ -49,19 +59,6 @@ UXTPMDIFrameWnd::~UXTPMDIFrameWnd()
 UXTPMDIFrameWnd *UXTPMDIFrameWnd::Get()
 {
     return theFrame();
-}
-
-void UXTPMDIFrameWnd::SetActiveViewForFrameAndPane(UView *view)
-{
-    activeView_ = view;
-    UpdateCommands();
-}
-
-void UXTPMDIFrameWnd::ResetActiveViewForFrameAndPane(UView *view)
-{
-    if (activeView_ == view) {
-        activeView_ = nullptr;
-    }
 }
 
 QAction *UXTPMDIFrameWnd::CommandAction(unsigned id)
@@ -89,18 +86,24 @@ QAction *UXTPMDIFrameWnd::AddCommand(QMenu &menu, unsigned id, const QString &te
 
 bool UXTPMDIFrameWnd::OnCommand(unsigned id)
 {
-    auto *target = dynamic_cast<kareport::CommandTarget *>(activeView_);
+    kareport::CommandState state;
+    if (kareport::CommandTarget *shown = PaneTarget(); shown != nullptr && shown->updateCommand(id, state)) {
+        return state.enabled && shown->runCommand(id);
+    }
+    kareport::CommandTarget *target = ViewTarget();
     return (target != nullptr && target->runCommand(id)) || runCommand(id);
 }
 
 void UXTPMDIFrameWnd::UpdateCommands()
 {
-    const auto *target = dynamic_cast<const kareport::CommandTarget *>(activeView_);
+    const kareport::CommandTarget *shown = PaneTarget();
+    const kareport::CommandTarget *target = ViewTarget();
     for (auto action = actions_.cbegin(); action != actions_.cend(); ++action) {
         kareport::CommandState state;
         state.checked = action.value()->isChecked();
-        const bool known =
-            (target != nullptr && target->updateCommand(action.key(), state)) || updateCommand(action.key(), state);
+        const bool known = (shown != nullptr && shown->updateCommand(action.key(), state)) ||
+                           (target != nullptr && target->updateCommand(action.key(), state)) ||
+                           updateCommand(action.key(), state);
         action.value()->setEnabled(known && state.enabled);
         if (action.value()->isCheckable()) {
             action.value()->setChecked(state.checked);
@@ -112,6 +115,7 @@ bool UXTPMDIFrameWnd::event(QEvent *event)
 {
     const bool taken = QMainWindow::event(event);
     if (event->type() == QEvent::LayoutRequest) {
+        SettleLater();
         // Another dock widget may have become a tab with one that must have no tabs: only that one knows then.
         for (QDockWidget *dock : findChildren<QDockWidget *>()) {
             auto *paneDock = dynamic_cast<kareport::PaneDock *>(dock);

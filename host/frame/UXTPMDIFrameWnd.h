@@ -7,12 +7,21 @@
 #include <QHash>
 #include <QMainWindow>
 
+#include <vector>
+
 class COneViewPane;
+class CViewPane;
 class QMenu;
+class UDocument;
 class UView;
 
 /// The main frame of the host: panes dock in it, and commands go from it to the active view and, when that has no handler,
 /// to itself. There is at most one at a time.
+///
+/// Of the panes that dock in it one is the active one. It has the keyboard, and its view is the active view. A pane that
+/// comes to the front, in whatever way, becomes the active one at once; when it goes, the one that was used last before it
+/// and can be seen follows. A pane without a view, as a report window is, leaves the active view as it is, but commands that
+/// it knows stay with it. No command reaches a view whose pane cannot be seen.
 class KAREPORT_EXPORT UXTPMDIFrameWnd : public QMainWindow, public kareport::CommandTarget
 {
 public:
@@ -26,8 +35,14 @@ public:
 
     /// The view that commands go to; null without one.
     UView *GetActiveView() const { return activeView_; }
-    /// Makes a view the active one, and its pane the active pane.
+    /// Makes a view the active one, and its pane the active pane: it comes to the front and gets the keyboard.
     void SetActiveViewForFrameAndPane(UView *view);
+    /// The docking pane with the keyboard; null without one.
+    COneViewPane *GetActivePane() const { return activePane_; }
+    /// Makes a pane that is in front the active one, gives it the keyboard, and tells its view.
+    void ActivatePane(COneViewPane &pane);
+    /// The document that commands are for: what the active pane shows or, without one, the active view. Null for none.
+    UDocument *GetCommandDocument() const;
     /// Takes the active view away when it is this one.
     void ResetActiveViewForFrameAndPane(UView *view);
 
@@ -47,9 +62,29 @@ public:
 
 protected:
     bool event(QEvent *event) override;
+    /// Called when panes were shown, hidden, raised or closed: makes the one in front that was used last the active one,
+    /// unless the active one is in front.
+    virtual void SettlePanes();
 
 private:
+    friend class COneViewPane;
+
+    void LeavePane(const COneViewPane &pane);
+    void ForgetPane(const COneViewPane &pane);
+    void SettleLater();
+    void TakePane(COneViewPane &pane);
+    void FollowKeyboard(const QWidget *now);
+    void WatchTabs();
+    void TabClicked(int index);
+    COneViewPane *PaneOf(const QWidget *widget) const;
+    COneViewPane *PaneInFront() const;
+    kareport::CommandTarget *PaneTarget() const;
+    kareport::CommandTarget *ViewTarget() const;
+
     CRibbonBar ribbonBar_;
     UView *activeView_ = nullptr;
+    COneViewPane *activePane_ = nullptr;
+    std::vector<COneViewPane *> usedPanes_; ///< the one that was used last at the end
+    bool willSettle_ = false;
     QHash<unsigned, QAction *> actions_;
 };

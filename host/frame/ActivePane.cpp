@@ -1,0 +1,256 @@
+#include "UXTPMDIFrameWnd.h"
+
+#include "COneViewPane.h"
+#include "PaneDock.h"
+#include "UView.h"
+
+#include <QApplication>
+#include <QPointer>
+#include <QTabBar>
+
+#include <algorithm>
+
+namespace
+{
+
+/// Whether a window is the frame, or one in which panes of it float. A dialog is none.
+bool holdsPanes(const QWidget *window, const QWidget *frame)
+{
+    return window == frame || dynamic_cast<const kareport::PaneDock *>(window) != nullptr ||
+           (window != nullptr && window->inherits("QDockWidgetGroupWindow"));
+}
+
+/// The window in which the keyboard was last, of those that hold panes.
+QPointer<const QWidget> &keyboardWindow()
+{
+    static QPointer<const QWidget> window;
+    return window;
+}
+
+/// Whether no window of the program is the active one because that which was has gone, or stands in the frame again. While
+/// the user works with another program it is there still.
+bool hasLostWindow()
+{
+    static bool hadWindow = false;
+    hadWindow = hadWindow || !keyboardWindow().isNull();
+    const QWidget *window = keyboardWindow();
+    return hadWindow && QApplication::activeWindow() == nullptr &&
+           (window == nullptr || !window->isWindow() || !window->isVisible());
+}
+
+} // namespace
+
+COneViewPane *UXTPMDIFrameWnd::PaneOf(const QWidget *widget) const
+{
+    // A dialog that a view has opened is not in the view's pane.
+    const kareport::PaneDock *dock = nullptr;
+    for (; widget != nullptr && widget != this; widget = widget->parentWidget()) {
+        dock = dock == nullptr ? dynamic_cast<const kareport::PaneDock *>(widget) : dock;
+        if (widget->isWindow() && !holdsPanes(widget, this)) {
+            return nullptr;
+        }
+    }
+    return widget == this && dock != nullptr ? dock->pane() : nullptr;
+}
+
+COneViewPane *UXTPMDIFrameWnd::PaneInFront() const
+{
+    const auto used = std::find_if(usedPanes_.rbegin(), usedPanes_.rend(),
+                                   [](const COneViewPane *pane) { return pane->IsInFront(); });
+    if (used != usedPanes_.rend()) {
+        return *used;
+    }
+    COneViewPane *inFront = nullptr;
+    for (const QDockWidget *dock : findChildren<QDockWidget *>()) {
+        COneViewPane *pane = PaneOf(dock);
+        if (pane != nullptr && pane->IsInFront() && (inFront == nullptr || pane->GetActiveView() != nullptr)) {
+            inFront = pane;
+        }
+    }
+    return inFront;
+}
+
+void UXTPMDIFrameWnd::TakePane(COneViewPane &pane)
+{
+    std::erase(usedPanes_, &pane);
+    usedPanes_.push_back(&pane);
+    activePane_ = &pane;
+    UView *view = pane.GetActiveView();
+    UView *previous = activeView_;
+    if (view != nullptr && view != previous) {
+        activeView_ = view;
+        if (previous != nullptr) {
+            previous->OnActivateView(false, view, previous);
+        }
+    }
+    // Whatever is told may close a pane.
+    if (view != nullptr && activeView_ == view) {
+        view->OnActivateView(true, view, previous);
+    }
+    UpdateCommands();
+}
+
+void UXTPMDIFrameWnd::ActivatePane(COneViewPane &pane)
+{
+    QDockWidget *dock = pane.GetDock();
+    if (dock == nullptr || PaneOf(dock) != &pane) {
+        return;
+    }
+    QWidget *window = dock->window();
+    const QWidget *active = QApplication::activeWindow();
+    if (hasLostWindow() || (active != nullptr && active != window && holdsPanes(active, this))) {
+        window->activateWindow();
+    }
+    const QWidget *focus = window->focusWidget();
+    if (pane.GetActiveView() == nullptr && (focus == nullptr || !dock->isAncestorOf(focus)) &&
+        dock->widget() != nullptr) {
+        dock->widget()->setFocus(Qt::OtherFocusReason);
+    }
+    TakePane(pane);
+}
+
+void UXTPMDIFrameWnd::SetActiveViewForFrameAndPane(UView *view)
+{
+    activeView_ = view;
+    auto *pane = view != nullptr ? dynamic_cast<COneViewPane *>(view->GetParentPane()) : nullptr;
+    if (pane != nullptr && pane->IsVisible() && PaneOf(pane->GetDock()) == pane) {
+        if (!pane->IsInFront()) {
+            pane->GetDock()->raise();
+        }
+        ActivatePane(*pane);
+        return;
+    }
+    if (activePane_ != nullptr && activePane_->GetActiveView() != nullptr) {
+        activePane_ = nullptr;
+    }
+    UpdateCommands();
+}
+
+void UXTPMDIFrameWnd::ResetActiveViewForFrameAndPane(UView *view)
+{
+    if (activeView_ == view) {
+        activeView_ = nullptr;
+        SettleLater();
+    }
+}
+
+void UXTPMDIFrameWnd::LeavePane(const COneViewPane &pane)
+{
+    if (activePane_ == &pane) {
+        activePane_ = nullptr;
+    }
+    if (activeView_ != nullptr && activeView_->GetParentPane() == &pane) {
+        activeView_ = nullptr;
+        UpdateCommands();
+    }
+    SettleLater();
+}
+
+void UXTPMDIFrameWnd::ForgetPane(const COneViewPane &pane)
+{
+    LeavePane(pane);
+    std::erase(usedPanes_, &pane);
+}
+
+void UXTPMDIFrameWnd::SettleLater()
+{
+    if (!willSettle_) {
+        willSettle_ = true;
+        QMetaObject::invokeMethod(
+            this,
+            [this] {
+                willSettle_ = false;
+                SettlePanes();
+            },
+            Qt::QueuedConnection);
+    }
+}
+
+void UXTPMDIFrameWnd::SettlePanes()
+{
+    WatchTabs();
+    auto *pane = activeView_ != nullptr ? dynamic_cast<COneViewPane *>(activeView_->GetParentPane()) : nullptr;
+    if (activeView_ != nullptr && pane == nullptr) {
+        return; // it stands in a window of the host's own
+    }
+    if (pane != nullptr && !pane->IsInFront()) {
+        activeView_ = nullptr;
+    }
+    if (activePane_ != nullptr && !activePane_->IsInFront()) {
+        activePane_ = nullptr;
+    }
+    const QWidget *focus = QApplication::focusWidget();
+    if (COneViewPane *withKeyboard = PaneOf(focus); withKeyboard != nullptr && withKeyboard->IsInFront()) {
+        if (withKeyboard != activePane_) {
+            TakePane(*withKeyboard);
+        }
+        return;
+    }
+    // The keyboard is in a pane that nobody sees, or was in one that has gone; a menu or a bar may have it.
+    const bool isLost =
+        focus == nullptr ? hasLostWindow() || holdsPanes(QApplication::activeWindow(), this) : PaneOf(focus) != nullptr;
+    COneViewPane *next = activePane_ != nullptr ? activePane_ : PaneInFront();
+    if (next != nullptr && (isLost || activePane_ == nullptr)) {
+        ActivatePane(*next);
+    } else {
+        UpdateCommands();
+    }
+}
+
+void UXTPMDIFrameWnd::FollowKeyboard(const QWidget *now)
+{
+    if (now != nullptr && holdsPanes(now->window(), this)) {
+        keyboardWindow() = now->window();
+    }
+    COneViewPane *pane = PaneOf(now);
+    if (pane == nullptr || pane == activePane_) {
+        return;
+    }
+    if (pane->IsInFront()) {
+        TakePane(*pane);
+    } else {
+        SettleLater();
+    }
+}
+
+void UXTPMDIFrameWnd::WatchTabs()
+{
+    for (const QTabBar *tabs : findChildren<QTabBar *>()) {
+        if (holdsPanes(tabs->parentWidget(), this)) {
+            connect(tabs, &QTabBar::tabBarClicked, this, &UXTPMDIFrameWnd::TabClicked, Qt::UniqueConnection);
+        }
+    }
+}
+
+void UXTPMDIFrameWnd::TabClicked(int index)
+{
+    // A tab that is in front already does not change: the pane gets the keyboard all the same.
+    const auto *tabs = qobject_cast<const QTabBar *>(sender());
+    const auto clicked = tabs != nullptr ? tabs->tabData(index).value<quintptr>() : 0;
+    for (const QDockWidget *dock : findChildren<QDockWidget *>()) {
+        COneViewPane *pane = reinterpret_cast<quintptr>(dock) == clicked ? PaneOf(dock) : nullptr;
+        if (pane != nullptr && pane->IsInFront()) {
+            ActivatePane(*pane);
+            return;
+        }
+    }
+}
+
+UDocument *UXTPMDIFrameWnd::GetCommandDocument() const
+{
+    if (activePane_ != nullptr && activePane_->GetShownDocument() != nullptr) {
+        return activePane_->GetShownDocument();
+    }
+    return activeView_ != nullptr ? activeView_->GetDocument() : nullptr;
+}
+
+kareport::CommandTarget *UXTPMDIFrameWnd::PaneTarget() const
+{
+    return activePane_ != nullptr && activePane_->IsInFront() ? activePane_->GetCommandTarget() : nullptr;
+}
+
+kareport::CommandTarget *UXTPMDIFrameWnd::ViewTarget() const
+{
+    const CViewPane *pane = activeView_ != nullptr ? activeView_->GetParentPane() : nullptr;
+    return pane == nullptr || pane->IsInFront() ? dynamic_cast<kareport::CommandTarget *>(activeView_) : nullptr;
+}

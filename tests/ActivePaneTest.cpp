@@ -1,0 +1,223 @@
+#include "ActivePaneFixture.h"
+
+#include <QClipboard>
+
+namespace
+{
+
+/// Three reports as tabs of one row; the last one was opened last.
+class ActivePane : public testing::Test
+{
+protected:
+    ActivePane()
+    {
+        for (const char *name : {"First", "Second", "Third"}) {
+            reports.push_back(desk.openReport(QString::fromUtf8(name)));
+        }
+        desk.application->SetCurrentReport(reports.back());
+    }
+
+    void expectActive(const UReportDoc &report, const char *reason, std::size_t view = 0) const
+    {
+        EXPECT_EQ(wrongWithActive(*desk.frame), QString()) << reason;
+        EXPECT_EQ(desk.frame->GetActiveView(), report.GetViews().at(view)) << reason;
+        EXPECT_EQ(desk.frame->GetCommandDocument(), &report) << reason;
+    }
+    COneViewPane &pane(std::size_t report) const { return dockPaneOf(*reports.at(report)); }
+
+    WindowDesk desk;
+    std::vector<UReportDoc *> reports;
+};
+
+TEST_F(ActivePane, ATabThatIsClickedHasKeyboardAndCommandsAtOnce)
+{
+    for (const std::size_t clicked : {0U, 2U, 1U, 0U, 1U}) {
+        ASSERT_TRUE(clickTab(*desk.frame, pane(clicked)));
+        ASSERT_TRUE(editOf(*reports[clicked]).hasFocus()) << "before anything else happens";
+        expectActive(*reports[clicked], "clicked");
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_X);
+        QGuiApplication::clipboard()->setText(QStringLiteral("y"));
+        desk.frame->OnCommand(57637);
+    }
+    EXPECT_EQ(textOf(*reports[0]), QStringLiteral("xyxy")) << "what was typed and what was pasted";
+    EXPECT_EQ(textOf(*reports[1]), QStringLiteral("xyxy"));
+    EXPECT_EQ(textOf(*reports[2]), QStringLiteral("xy"));
+}
+
+TEST_F(ActivePane, ATabThatIsInFrontAlreadyGetsTheKeyboardBack)
+{
+    UReportWindowDlg window;
+    ASSERT_TRUE(window.createDocked(QStringLiteral("Window"), nullptr));
+    WindowDesk::settle();
+    ASSERT_EQ(desk.frame->GetActivePane(), &window) << "a window that comes has the keyboard";
+    ASSERT_TRUE(clickTab(*desk.frame, pane(2)));
+    expectActive(*reports[2], "its tab was pressed");
+}
+
+TEST_F(ActivePane, WhateverBringsAPaneToTheFrontMakesItTheActiveOne)
+{
+    struct Row
+    {
+        std::function<void()> act;
+        std::size_t expected;
+        const char *reason;
+    };
+    const Row rows[] = {
+        {[this] { pane(0).GetDock()->raise(); }, 0, "raised"},
+        {[this] { pane(1).BringToTop(); }, 1, "brought to the top"},
+        {[this] { desk.frame->SetActiveViewForFrameAndPane(reports[0]->GetViews().front()); }, 0, "its view activated"},
+        {[this] { pane(2).ShowPane(true); }, 2, "shown"},
+        {[this] { pane(2).ShowPane(false); }, 0, "that before it is hidden: the one that was used last follows"},
+        {[this] { pane(2).GetDock()->toggleViewAction()->trigger(); }, 2, "brought back from the list of panes"},
+        {[this] { pane(1).GetDock()->setFloating(true); }, 1, "another one gets a window of its own"},
+        {[this] { pane(1).BringToTop(); }, 1, "a window of its own"},
+        {[this] { QTest::mouseClick(pane(2).GetDock(), Qt::LeftButton, Qt::NoModifier, QPoint(3, 3)); }, 2,
+         "its title"},
+        {[this] { pane(1).GetDock()->activateWindow(); }, 1, "the user goes to a window of its own"},
+        {[this] {
+             pane(1).GetDock()->setFloating(false);
+             desk.frame->splitDockWidget(pane(0).GetDock(), pane(1).GetDock(), Qt::Horizontal);
+             pane(0).BringToTop();
+         },
+         0, "docked beside the others"},
+        {[this] { QTest::mouseClick(editOf(*reports[1]).viewport(), Qt::LeftButton); }, 1, "pressed in"},
+        {[this] { pane(1).GetDock()->close(); }, 0, "that which is closed gives way"},
+    };
+    for (const Row &row : rows) {
+        row.act();
+        WindowDesk::settle();
+        if (row.expected < reports.size() && UReportDoc::IsReportAvailable(reports[row.expected])) {
+            expectActive(*reports[row.expected], row.reason);
+        }
+    }
+    EXPECT_FALSE(UReportDoc::IsReportAvailable(reports[1]));
+    reports[0]->OnCloseDocument();
+    WindowDesk::settle();
+    expectActive(*reports[2], "the last one");
+    reports[2]->OnCloseDocument();
+    WindowDesk::settle();
+    EXPECT_EQ(wrongWithActive(*desk.frame), QString()) << "nothing is left";
+    EXPECT_EQ(desk.frame->GetActiveView(), nullptr);
+}
+
+/// Keeps what it is told of being active.
+class ToldView : public UReportView
+{
+public:
+    void OnActivateView(bool activate, UView *activated, UView *deactivated) override
+    {
+        told.push_back({activate, activated, deactivated});
+        UReportView::OnActivateView(activate, activated, deactivated);
+    }
+    struct Told
+    {
+        bool activate;
+        UView *activated;
+        UView *deactivated;
+        bool operator==(const Told &) const = default;
+    };
+    std::vector<Told> told;
+};
+
+TEST_F(ActivePane, ViewsAreToldThatTheyWereActivated)
+{
+    UApplication told;
+    told.AddDocTemplate(
+        kareport::makeReportTemplate([] { return new CReportViewPane; }, [] { return std::make_unique<ToldView>(); }));
+    const UReportDoc *report = desk.openReport(QStringLiteral("Told"));
+    auto *view = dynamic_cast<ToldView *>(report->GetViews().front());
+    UView *third = reports[2]->GetViews().front();
+    ASSERT_TRUE(clickTab(*desk.frame, pane(2)));
+    view->told.clear();
+    ASSERT_TRUE(clickTab(*desk.frame, dockPaneOf(*report)));
+    ASSERT_FALSE(view->told.empty());
+    EXPECT_EQ(view->told.front(), (ToldView::Told{true, view, third}));
+    view->told.clear();
+    ASSERT_TRUE(clickTab(*desk.frame, pane(2)));
+    ASSERT_FALSE(view->told.empty());
+    EXPECT_EQ(view->told.front(), (ToldView::Told{false, third, view}));
+
+    view->told.clear();
+    view->OnMouseActivate();
+    ASSERT_FALSE(view->told.empty());
+    EXPECT_EQ(view->told.back(), (ToldView::Told{true, view, third})) << "pressed in, by the view itself";
+    desk.frame->setFocus();
+    view->told.clear();
+    view->OnMouseActivate();
+    ASSERT_FALSE(view->told.empty());
+    EXPECT_EQ(view->told.front(), (ToldView::Told{true, view, view})) << "it is active, and gets the keyboard back";
+    EXPECT_TRUE(view->GetEdit().hasFocus());
+    view->told.clear();
+    view->OnMouseActivate();
+    EXPECT_TRUE(view->told.empty()) << "it has both";
+}
+
+TEST_F(ActivePane, NoCommandReachesAViewThatNobodySees)
+{
+    QGuiApplication::clipboard()->setText(QStringLiteral("pasted"));
+    reports[0]->SetData(QStringLiteral("kept"));
+    UView *hidden = reports[0]->GetViews().front();
+    pane(0).ShowPane(false);
+    desk.frame->SetActiveViewForFrameAndPane(hidden); // as a host may do
+    desk.frame->OnCommand(57637);
+    const QAction *paste = desk.frame->CommandAction(57637);
+    desk.frame->UpdateCommands();
+    EXPECT_FALSE(paste->isEnabled());
+    EXPECT_EQ(textOf(*reports[0]), QStringLiteral("kept"));
+}
+
+TEST_F(ActivePane, APaneThatWasHiddenWhileItsReportWasWrittenShowsTheReport)
+{
+    reports[0]->WriteLine(QStringLiteral("one"), 0, 1, 0);
+    reports[0]->UpdateAllViews(nullptr);
+    pane(0).ShowPane(false);
+    reports[0]->WriteLine(QStringLiteral("two"), 0, 1, 0);
+    pane(0).ShowPane(true);
+    WindowDesk::settle();
+    EXPECT_EQ(editOf(*reports[0]).toPlainText(), QStringLiteral("one\ntwo\n"));
+    QTest::keyClick(QApplication::focusWidget(), Qt::Key_X);
+    EXPECT_EQ(textOf(*reports[0]), QStringLiteral("xone\r\ntwo\r\n")) << "an edit of less would take its place";
+}
+
+TEST_F(ActivePane, AHiddenPaneDoesNotKeepAReport)
+{
+    UReportDoc *report = reports[0];
+    report->Activate(true);
+    ASSERT_EQ(dockPaneOf(*report, 1).GetWindowNumber(), 2);
+    report->UpdateReportInfo(QString(), false, false); // hides the first pane
+    ASSERT_FALSE(dockPaneOf(*report).IsVisible());
+    EXPECT_EQ(dockPaneOf(*report).GetWindowNumber(), 0);
+    EXPECT_EQ(dockPaneOf(*report, 1).GetWindowNumber(), 0) << "an only pane again";
+    report->SetModifiedFlag(true);
+    const AnsweredBoxes boxes(MessageAnswer::Cancel);
+    dockPaneOf(*report, 1).GetDock()->close();
+    EXPECT_EQ(boxes.boxes.size(), 1U);
+    EXPECT_TRUE(UReportDoc::IsReportAvailable(report)) << "cancelled";
+    dockPaneOf(*report).ShowPane(true);
+    EXPECT_EQ(dockPaneOf(*report).GetWindowNumber(), 1) << "counted again";
+    EXPECT_EQ(dockPaneOf(*report, 1).GetWindowNumber(), 2);
+}
+
+TEST_F(ActivePane, AnExitThatIsRefusedClosesNoReportLater)
+{
+    class RefusingFrame : public UXTPMDIFrameWnd
+    {
+    protected:
+        void closeEvent(QCloseEvent *event) override { event->ignore(); }
+    };
+    desk.frame.reset();
+    RefusingFrame frame;
+    frame.show();
+    UReportDoc *report = CreateReportWindow(QStringLiteral("Written"), false, false);
+    UReportDoc *other = CreateReportWindow(QStringLiteral("Other"), false, false);
+    report->Activate(true);
+    other->SetCloseDocument(1);
+    dynamic_cast<UReportView *>(report->GetViews().front())->OnReportExit();
+    report->OnCloseDocument();
+    EXPECT_FALSE(UReportDoc::IsReportAvailable(report));
+    other->OnCloseDocument();
+    EXPECT_FALSE(UReportDoc::IsReportAvailable(other)) << "all of them close as before";
+    desk.application.reset();
+}
+
+} // namespace

@@ -1,0 +1,28 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+class QMenu;
+class QMenuBar;
+class UXTPMDIFrameWnd;
+
+namespace kareport
+{
+
+/// The menus of a report in a menu bar, which owns them.
+struct ReportMenu
+{
+    QMenu *file = nullptr;
+    QMenu *edit = nullptr;
+    QMenu *view = nullptr;
+    QMenu *window = nullptr;
+    QMenu *help = nullptr;
+};
+
+/// Adds the menus of a report to a menu bar: File, Edit, View, Window and Help, in the user's language. Their commands go
+/// through the frame to whatever shows the report; those that only a host can do, such as New and Open, are disabled unless
+/// the frame's own commands handle their numbers. The host may add entries of its own; the action of an entry is
+/// `frame.CommandAction(number)`.
+KAREPORT_EXPORT ReportMenu addReportMenu(UXTPMDIFrameWnd &frame, QMenuBar &bar);
+
+} // namespace kareport
