@@ -260,12 +260,14 @@ TEST(UReportDocLife, PanesMayCloseWhenAnotherKeepsTheReportOrTheUserAgrees)
         report.SetAutoDelete(false);
         CViewPane panes[2];
         std::size_t count = 0;
-        for (const int number : row.paneNumbers) {
-            showIn<UView>(panes[count], report);
-            panes[count++].SetWindowNumber(number);
+        for (std::size_t i = 0; i < row.paneNumbers.size(); ++i) {
+            showIn<UView>(panes[count++], report);
         }
         UView withoutPane;
         report.AddView(&withoutPane);
+        for (std::size_t i = 0; i < count; ++i) {
+            panes[i].SetWindowNumber(row.paneNumbers[i]); // whatever the panes were counted to
+        }
         report.SetCanClose(row.canClose);
         report.SetModifiedFlag(row.modified);
         EXPECT_EQ(report.CanCloseFrame(nullptr), row.expected) << row.reason;

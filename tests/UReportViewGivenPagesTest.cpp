@@ -269,12 +269,12 @@ TEST(UReportViewGivenPages, AnEditKeepsThePagesOnTheirSheets)
     UReportView &view = report.open();
     QTextCursor cursor(view.GetEdit().document());
     cursor.movePosition(QTextCursor::Down, QTextCursor::MoveAnchor, 10);
-    cursor.insertText(QStringLiteral("another line\n"));
+    cursor.insertText(QStringLiteral("another line\n").repeated(3));
     view.OnReportPrint();
     const PdfReadBack pdf = readBack(printing.file());
     EXPECT_THAT(firstLines(pdf, 6), ElementsAre("page 1", "page 2", "page 3"));
     EXPECT_TRUE(pdf.pages().at(0).contains(QStringLiteral("line 59 of page 1")))
-        << "60 lines on the first sheet, and an end";
+        << "62 lines on the first sheet, in smaller type";
 }
 
 TEST(UReportViewGivenPages, WideLinesWideCharactersAndTabsStayOnTheirSheets)
@@ -322,12 +322,32 @@ TEST(UReportViewGivenPages, RichTextHasThePagesOfTheReport)
     ASSERT_TRUE(view.ShowsFormats());
     view.OnReportPrint();
     EXPECT_THAT(firstLines(readBack(printing.file()), 6), ElementsAre("page 1", "page 2", "page 3"));
+}
 
+TEST(UReportViewGivenPages, EditedRichTextHasThePagesOfItsHeaders)
+{
+    AnsweredPrinting printing;
+    ShownReport report;
+    report.report.SetRTFDataFlag(true);
+    report.report.FixPage(60, 80);
+    report.report.SetTitle(QStringLiteral("Points"));
+    report.report.SetHeaderFlag(true);
+    for (int line = 0; line < 150; ++line) {
+        report.report.WriteLine(QStringLiteral("line %1").arg(line), 0, 1, line % 4);
+    }
+    UReportView &view = report.open();
+    ASSERT_TRUE(view.ShowsFormats());
     QTextCursor cursor(view.GetEdit().document());
     cursor.movePosition(QTextCursor::Down, QTextCursor::MoveAnchor, 10);
-    cursor.insertText(QStringLiteral("another line\n"));
+    cursor.insertText(QStringLiteral("another line\n").repeated(3));
     view.OnReportPrint();
-    EXPECT_THAT(firstLines(readBack(printing.file()), 6), ElementsAre("page 1", "page 2", "page 3")) << "edited";
+    const QStringList sheets = readBack(printing.file()).pages();
+    ASSERT_EQ(sheets.size(), 3);
+    for (int page = 1; page <= 3; ++page) {
+        const QString header = sheets.at(page - 1).trimmed().section(u'\n', 0, 0);
+        EXPECT_TRUE(header.startsWith(QStringLiteral("TALVEN - Points"))) << header.toStdString();
+        EXPECT_TRUE(header.endsWith(QString::number(page))) << header.toStdString();
+    }
 }
 
 TEST(UReportViewGivenPages, EmptyAndBlankReports)

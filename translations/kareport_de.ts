@@ -195,13 +195,13 @@
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
-        <source>no fixed-pitch font was found: DejaVu Sans Mono, Liberation Mono or Hack was expected</source>
-        <translation>keine dicktengleiche Schrift wurde gefunden: DejaVu Sans Mono, Liberation Mono oder Hack wurde erwartet</translation>
+        <source>the font file "%1" cannot be used</source>
+        <translation>die Schriftdatei „%1“ kann nicht verwendet werden</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
-        <source>the font file "%1" cannot be used</source>
-        <translation>die Schriftdatei „%1“ kann nicht verwendet werden</translation>
+        <source>no fixed-pitch font was found: DejaVu Sans Mono, Liberation Mono or Hack was expected</source>
+        <translation>keine dicktengleiche Schrift wurde gefunden: DejaVu Sans Mono, Liberation Mono oder Hack wurde erwartet</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
@@ -209,17 +209,32 @@
         <translation>abgebrochen</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
-        <source>the lines %1 to %2 of the report become %3 when they are broken: they do not fit one page</source>
-        <translation>die Zeilen %1 bis %2 des Berichts ergeben umbrochen %3 Zeilen: sie passen nicht auf eine Seite</translation>
+        <location filename="../output/PdfNotes.cpp"/>
+        <source>line %1 is</source>
+        <translation>Zeile %1 ist</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
+        <location filename="../output/PdfNotes.cpp"/>
+        <source>%1 lines, the first of them line %2, are</source>
+        <translation>%1 Zeilen, zuerst Zeile %2, sind</translation>
+    </message>
+    <message>
+        <location filename="../output/PdfNotes.cpp"/>
+        <source>%1 wider than the page: the type is %2 points on all pages</source>
+        <translation>%1 breiter als die Seite: die Schrift hat auf allen Seiten %2 Punkt</translation>
+    </message>
+    <message>
+        <location filename="../output/PdfNotes.cpp"/>
+        <source>%1 wider than the page in type of %2 points: what is too wide goes on below</source>
+        <translation>%1 auch bei %2 Punkt breiter als die Seite: was zu breit ist, steht darunter</translation>
+    </message>
+    <message>
+        <location filename="../output/PdfNotes.cpp"/>
         <source>no font has the character "%1" (U+%2), first in line %3, %4 times in all</source>
         <translation>keine Schrift enthält das Zeichen „%1“ (U+%2), zuerst in Zeile %3, insgesamt %4-mal</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
+        <location filename="../output/PdfNotes.cpp"/>
         <source>no font has %1 other characters, %2 times in all</source>
         <translation>%1 weitere Zeichen sind in keiner Schrift enthalten, insgesamt %2-mal</translation>
     </message>
@@ -1254,6 +1269,11 @@
         <location filename="../apps/kareport/OutputsWriter.cpp"/>
         <source>kareport: the report is empty: "%1" was not written</source>
         <translation>kareport: der Bericht ist leer: „%1“ wurde nicht geschrieben</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/OutputsWriter.cpp"/>
+        <source>kareport: the report is empty, and a PDF has a page at least: "%1" was not written</source>
+        <translation>kareport: Der Bericht ist leer, und eine PDF-Datei hat mindestens eine Seite: „%1“ wurde nicht geschrieben</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputsWriter.cpp"/>

@@ -195,13 +195,13 @@
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
-        <source>no fixed-pitch font was found: DejaVu Sans Mono, Liberation Mono or Hack was expected</source>
-        <translation>等幅フォントが見つかりません: DejaVu Sans Mono、Liberation Mono、Hack のいずれかが必要です</translation>
+        <source>the font file "%1" cannot be used</source>
+        <translation>フォントファイル「%1」は使用できません</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
-        <source>the font file "%1" cannot be used</source>
-        <translation>フォントファイル「%1」は使用できません</translation>
+        <source>no fixed-pitch font was found: DejaVu Sans Mono, Liberation Mono or Hack was expected</source>
+        <translation>等幅フォントが見つかりません: DejaVu Sans Mono、Liberation Mono、Hack のいずれかが必要です</translation>
     </message>
     <message>
         <location filename="../output/PdfExport.cpp"/>
@@ -209,17 +209,32 @@
         <translation>中断されました</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
-        <source>the lines %1 to %2 of the report become %3 when they are broken: they do not fit one page</source>
-        <translation>帳票の %1 行目から %2 行目までを折り返すと %3 行になり、1 ページに収まりません</translation>
+        <location filename="../output/PdfNotes.cpp"/>
+        <source>line %1 is</source>
+        <translation>%1 行目が</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
+        <location filename="../output/PdfNotes.cpp"/>
+        <source>%1 lines, the first of them line %2, are</source>
+        <translation>%1 行 (最初は %2 行目) が</translation>
+    </message>
+    <message>
+        <location filename="../output/PdfNotes.cpp"/>
+        <source>%1 wider than the page: the type is %2 points on all pages</source>
+        <translation>%1ページより幅が広いため、すべてのページの文字は %2 ポイントです</translation>
+    </message>
+    <message>
+        <location filename="../output/PdfNotes.cpp"/>
+        <source>%1 wider than the page in type of %2 points: what is too wide goes on below</source>
+        <translation>%1 %2 ポイントの文字でもページより幅が広いため、はみ出す部分は下の行に続きます</translation>
+    </message>
+    <message>
+        <location filename="../output/PdfNotes.cpp"/>
         <source>no font has the character "%1" (U+%2), first in line %3, %4 times in all</source>
         <translation>文字「%1」(U+%2) を含むフォントがありません (最初は %3 行目、全 %4 回)</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
+        <location filename="../output/PdfNotes.cpp"/>
         <source>no font has %1 other characters, %2 times in all</source>
         <translation>ほかに %1 種類の文字を含むフォントがありません (全 %2 回)</translation>
     </message>
@@ -1254,6 +1269,11 @@
         <location filename="../apps/kareport/OutputsWriter.cpp"/>
         <source>kareport: the report is empty: "%1" was not written</source>
         <translation>kareport: 帳票が空です: 「%1」は書き込まれませんでした</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/OutputsWriter.cpp"/>
+        <source>kareport: the report is empty, and a PDF has a page at least: "%1" was not written</source>
+        <translation>kareport: レポートが空です。PDF には少なくとも 1 ページが必要なため、「%1」は書き込まれませんでした</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputsWriter.cpp"/>
