@@ -14,6 +14,7 @@
 #include <QFile>
 #include <QFileInfo>
 #include <QMessageBox>
+#include <QTextDocument>
 
 #include <algorithm>
 
@@ -38,6 +39,27 @@ bool isWithinReach(const UReportDoc &report)
 {
     const auto *window = dynamic_cast<const UReportWindowDlg *>(report.GetReportWindow());
     return report.IsShown() || (window != nullptr && window->isCreated()) || report.GetExternalEditorFlag();
+}
+
+/// Where two texts part, for whoever reads the log.
+QString difference(const QString &one, const QString &other)
+{
+    const auto [a, b] = std::mismatch(one.begin(), one.end(), other.begin(), other.end());
+    const auto around = [](const QString &text, qsizetype at) {
+        return text.mid(std::max<qsizetype>(0, at - 10), 30).toHtmlEscaped().replace(u'\n', QStringLiteral("\\n"));
+    };
+    const qsizetype at = a - one.begin();
+    return QStringLiteral("%1 and %2 characters, from %3: '%4', '%5'")
+        .arg(one.size())
+        .arg(other.size())
+        .arg(at)
+        .arg(around(one, at), around(other, at));
+}
+
+/// A text with the line ends that a control has.
+QString asShown(QString text)
+{
+    return text.replace(QStringLiteral("\r\n"), QStringLiteral("\n")).replace(u'\r', u'\n').replace(QChar(0xA0), u' ');
 }
 
 bool isRich(const UReportDoc &report)
@@ -115,29 +137,33 @@ QString World::checkClosed() const
 
 QString World::checkTexts() const
 {
-    const bool isReloaded = std::any_of(given_.begin(), given_.end(),
-                                        [](const Answer &answer) { return answer.button == QMessageBox::Yes; });
+    const bool isReloaded = std::any_of(given_.begin(), given_.end(), [](const Answer &answer) {
+        return answer.button == QMessageBox::Yes && answer.question.contains(QStringLiteral("by another program"));
+    });
     for (const UReportDoc *report : reports()) {
-        const auto was = std::find_if(before_.begin(), before_.end(),
-                                      [&](const Seen &seen) { return seen.id == ids_.value(report); });
-        if (was == before_.end()) {
+        const Seen *was = seen(ids_.value(report));
+        if (was == nullptr || isReloaded) {
             continue;
         }
-        if (textOf(*report) != was->text && mayChange.count(report) == 0 && !(mayReload && isReloaded)) {
-            return QStringLiteral("the text of %1 has changed, which this step does not do").arg(nameOf(*was));
+        const QString text = textOf(*report);
+        if (text != was->text && mayChange.count(report) == 0) {
+            return QStringLiteral("the text of %1 has changed, which this step does not do: %2")
+                .arg(nameOf(*was), difference(was->text, text));
         }
-        const bool isForgotten = was->isModified && !report->IsModified() && !(mayReload && isReloaded);
-        if (isForgotten && !report->IsEmpty() && !isKept(textOf(*report))) {
+        if (was->isModified && !report->IsModified() && !text.isEmpty() && !isKept(text)) {
             return QStringLiteral("%1 counts as saved and is in no file").arg(nameOf(*was));
         }
     }
     for (const UReportView *view : viewsOnScreen()) {
         const UReportDoc *report = view->GetDocument();
-        if (report != nullptr && !isRich(*report) && !view->ShowsFormats() &&
-            QString(textOf(*report)).replace(QStringLiteral("\r\n"), QStringLiteral("\n")) !=
-                view->GetEdit().windowText().replace(QStringLiteral("\r\n"), QStringLiteral("\n")))
-        {
-            return QStringLiteral("a view of %1 shows another text than the report has").arg(nameOf(*report));
+        if (report == nullptr || isRich(*report) || view->ShowsFormats()) {
+            continue;
+        }
+        const QString text = asShown(textOf(*report));
+        const QString shown = view->GetEdit().document()->toPlainText();
+        if (text != shown) {
+            return QStringLiteral("a view of %1 shows another text than the report has: %2")
+                .arg(nameOf(*report), difference(text, shown));
         }
     }
     return {};
