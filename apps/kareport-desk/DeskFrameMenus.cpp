@@ -52,7 +52,7 @@ void DeskFrame::makeMenus()
     CommandAction(helpContentsCommand)->setShortcut(QKeySequence(Qt::Key_F1));
     CommandAction(fileSaveCommand)->setIcon(reportIcon(commandSaveReport));
     CommandAction(filePrintCommand)->setIcon(reportIcon(commandPrintReport));
-    recentFiles_ = new QMenu(this);
+    recentFiles_ = new QMenu(menu.file);
     CommandAction(recentFileCommand)->setMenu(recentFiles_);
     connect(menu.file, &QMenu::aboutToShow, this, [this] { fillRecentFiles(); });
 
