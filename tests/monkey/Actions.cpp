@@ -35,9 +35,12 @@ namespace monkey
 namespace
 {
 
-/// What the keyboard writes into may change.
+/// What the keyboard writes into, and commands are for, may change.
 void aimKeyboard(World &world)
 {
+    if (const auto *report = dynamic_cast<const UReportDoc *>(world.frame().GetCommandDocument())) {
+        world.mayChange.insert(report);
+    }
     if (const UReportView *view = World::viewWithKeyboard()) {
         world.mayChange.insert(view->GetDocument());
     }
