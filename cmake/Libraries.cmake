@@ -16,10 +16,11 @@ function(ka_shared_library target)
         list(APPEND headers ${layer_headers})
     endforeach()
     add_library(${target} SHARED ${objects})
-    set_target_properties(${target} PROPERTIES LINKER_LANGUAGE CXX VERSION ${PROJECT_VERSION} SOVERSION 0)
+    set_target_properties(${target} PROPERTIES LINKER_LANGUAGE CXX VERSION ${PROJECT_VERSION} SOVERSION 0
+                                               INSTALL_RPATH "$ORIGIN")
     target_include_directories(${target} INTERFACE ${includes} $<INSTALL_INTERFACE:include/KaReport>)
     target_compile_features(${target} INTERFACE cxx_std_20)
-    target_link_libraries(${target} PRIVATE ka_options)
+    target_link_libraries(${target} PRIVATE ka_options ka_hardening)
     set_property(TARGET ${target} PROPERTY KA_INSTALLED_HEADERS ${headers})
 endfunction()
 

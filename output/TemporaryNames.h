@@ -2,8 +2,10 @@
 
 #include "KaReportExport.h"
 
-#include <QSet>
+#include <QHashFunctions>
 #include <QString>
+
+#include <unordered_set>
 
 namespace kareport
 {
@@ -23,7 +25,7 @@ public:
 private:
     static constexpr int lastNumber = 1000;
 
-    QSet<QString> handedOut_;
+    std::unordered_set<QString> handedOut_;
 };
 
 } // namespace kareport

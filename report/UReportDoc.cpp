@@ -35,7 +35,7 @@ private:
 
 } // namespace
 
-QHash<const UReportDoc *, bool> UReportDoc::UReportMgr;
+std::unordered_map<const UReportDoc *, bool> UReportDoc::UReportMgr;
 bool UReportDoc::printHash_ = false;
 
 UReportDoc::UReportDoc() : UReportDoc(QString(), false, false, nullptr) {}
@@ -54,12 +54,12 @@ UReportDoc::UReportDoc(const QString &name, bool externalEditor, bool closeDocum
         printHash_ = kareport::leadingInteger(printHash) != 0;
     }
     chainageLabel_ = Xlate("Station");
-    UReportMgr.insert(this, true); // nothing after it can fail: what is entered is alive
+    UReportMgr.emplace(this, true); // nothing after it can fail: what is entered is alive
 }
 
 UReportDoc::~UReportDoc()
 {
-    UReportMgr.remove(this);
+    UReportMgr.erase(this);
     delete std::exchange(reportWindow_, nullptr);
 }
 

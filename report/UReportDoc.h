@@ -13,7 +13,6 @@
 #include "UXmlReportTable.h"
 #include "UXmlReportTpl.h"
 
-#include <QHash>
 #include <QMargins>
 #include <QSize>
 #include <QString>
@@ -21,6 +20,7 @@
 #include <functional>
 #include <memory>
 #include <optional>
+#include <unordered_map>
 
 class CViewPane;
 class QIODevice;
@@ -404,7 +404,7 @@ private:
     void openOwnPane();
 
     /// Every live report, with the value true.
-    static QHash<const UReportDoc *, bool> UReportMgr;
+    static std::unordered_map<const UReportDoc *, bool> UReportMgr;
     /// Whether a value wider than its column prints as "#": one setting for all reports.
     static bool printHash_;
 

@@ -118,7 +118,11 @@ void UReportDoc::showFrame()
 
 void UReportDoc::openInEditor(const QString &editor)
 {
-    const QString file = saveForEditor(GetCurrentReportFileName());
+    const QString name = GetCurrentReportFileName();
+    if (name.isEmpty()) {
+        return; // memory has ended
+    }
+    const QString file = saveForEditor(name);
     CViewPane *frame = GetFrameWindow();
     if (frame != nullptr && !closeDocument_) {
         frame->ShowPane(false);
@@ -222,6 +226,9 @@ void UReportDoc::ReportRTfData()
 void UReportDoc::openWrittenInEditor(const QString &editor)
 {
     const QString name = GetCurrentReportFileName();
+    if (name.isEmpty()) {
+        return; // memory has ended
+    }
     const bool takesRichText = kareport::editorKind(editor, IsOptionExcel()) == EditorKind::WordProcessor;
     const QString richText = takesRichText ? writeRichTextForEditor(name) : QString();
     startEditor(editor, richText.isEmpty() ? saveForEditor(name) : richText, *this);

@@ -8,4 +8,13 @@ scripts/build.sh package
 mkdir -p out/packages
 cpack --config build/package/CPackConfig.cmake -B out/packages
 rm -rf out/packages/_CPack_Packages
+
+# What is in the packages keeps out what a folder or a file may try.
+unpacked=$(mktemp -d)
+trap 'rm -rf "$unpacked"' EXIT
+for package in out/packages/*.deb; do
+    dpkg-deb -x "$package" "$unpacked"
+done
+mapfile -t binaries < <(find "$unpacked" -type f \( -path '*/bin/*' -o -name '*.so.*' \))
+scripts/check-binaries.sh "${binaries[@]}"
 ls -l out/packages

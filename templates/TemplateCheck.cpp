@@ -7,10 +7,11 @@
 #include "VariableType.h"
 #include "Xlate.h"
 
-#include <QHash>
-#include <QSet>
+#include <QHashFunctions>
 
 #include <algorithm>
+#include <unordered_map>
+#include <unordered_set>
 
 namespace kareport
 {
@@ -52,6 +53,8 @@ QString textOf(const ScanNote &note)
     return Xlate("\"%1\" is dropped with the short closing tag of %2").arg(note.text, tag);
 }
 
+using Names = std::unordered_set<QString>; ///< folded
+
 class Checker
 {
 public:
@@ -69,14 +72,14 @@ private:
     void checkDictionaries(const std::vector<DictionaryElement> &dictionaries);
     void checkVariables(const DictionaryElement &dictionary);
     void checkOutput(const OutputElement &output, bool isTable);
-    void checkField(const FieldElement &field, const QSet<QString> *variables, bool isTable);
+    void checkField(const FieldElement &field, const Names *variables, bool isTable);
     void checkText(const ScanElement &element);
     void addNotes();
 
     TextPlaces places_;
     ScanText scan_;
     ScanNotes notes_;
-    QHash<QString, QSet<QString>> variables_; ///< of the template at hand, by the dictionary's folded name
+    std::unordered_map<QString, Names> variables_; ///< of the template at hand, by the dictionary's folded name
     std::vector<TemplateRemark> remarks_;
 };
 
@@ -111,7 +114,7 @@ void Checker::checkTags()
 
 void Checker::checkNames(const std::vector<TemplateElement> &templates)
 {
-    QSet<QString> names;
+    Names names;
     for (const TemplateElement &element : templates) {
         if (element.name.value.isEmpty()) {
             error(element.body.source, Xlate("the template has no <Name>, so nobody can choose it"));
@@ -152,9 +155,9 @@ void Checker::checkTemplate(const TemplateElement &element)
         checkOutput(block, false);
     }
     for (const SortElement &sort : sorts) {
-        const auto known = variables_.constFind(foldedKey(sort.use.value.view()));
+        const auto known = variables_.find(foldedKey(sort.use.value.view()));
         for (const ScanElement &name : sort.variableNames) {
-            if (known != variables_.constEnd() && !known->contains(foldedKey(name.value.view()))) {
+            if (known != variables_.end() && !known->second.contains(foldedKey(name.value.view()))) {
                 error(name.source,
                       Xlate("the sort key %1 is not in the dictionary %2").arg(quoted(name), quoted(sort.use)));
             }
@@ -181,8 +184,8 @@ void Checker::checkDictionaries(const std::vector<DictionaryElement> &dictionari
 
 void Checker::checkVariables(const DictionaryElement &dictionary)
 {
-    QSet<QString> &known = variables_[foldedKey(dictionary.name.value.view())];
-    QHash<qint32, QString> ids;
+    Names &known = variables_[foldedKey(dictionary.name.value.view())];
+    std::unordered_map<qint32, QString> ids;
     for (const VariableElement &variable : dictionary.variables) {
         if (!variableTypeFromKeyword(variable.type.value.view())) {
             error(variable.type.exists() ? variable.type.source : variable.element.source,
@@ -202,12 +205,11 @@ void Checker::checkVariables(const DictionaryElement &dictionary)
                     Xlate("the variable %1 stands twice in the dictionary: the last one counts")
                         .arg(quoted(variable.variableName)));
         } else if (ids.contains(id)) {
-            warning(variable.element.source,
-                    Xlate("the variables %1 and %2 share the identifier %3")
-                        .arg(ids.value(id), quoted(variable.variableName), QString::number(id)));
+            warning(variable.element.source, Xlate("the variables %1 and %2 share the identifier %3")
+                                                 .arg(ids.at(id), quoted(variable.variableName), QString::number(id)));
         }
         known.insert(key);
-        ids.insert(id, quoted(variable.variableName));
+        ids.insert_or_assign(id, quoted(variable.variableName));
     }
 }
 
@@ -225,14 +227,13 @@ void Checker::checkOutput(const OutputElement &output, bool isTable)
     if (output.fields.empty()) {
         warning(output.element.source, Xlate("%1 has no fields").arg(quoted(output.name)));
     }
-    const QSet<QString> *variables =
-        hasDictionary ? &*variables_.constFind(foldedKey(output.use.value.view())) : nullptr;
+    const Names *variables = hasDictionary ? &variables_.at(foldedKey(output.use.value.view())) : nullptr;
     for (const FieldElement &field : output.fields) {
         checkField(field, variables, isTable);
     }
 }
 
-void Checker::checkField(const FieldElement &field, const QSet<QString> *variables, bool isTable)
+void Checker::checkField(const FieldElement &field, const Names *variables, bool isTable)
 {
     const ScanElement &name = field.variableName;
     const qsizetype source = name.exists() ? name.source : field.element.source;

@@ -130,7 +130,7 @@ bool UXmlReportTpl::ReadDictionary()
             }
             const qint32 id = kareport::leadingInteger(variable.id.value.view());
             dictionary.Variables.push_back({variable.variableName.value.text(), id, *type});
-            infos.insert(foldedKey(variable.variableName.value.view()), {id, *type});
+            infos.insert_or_assign(foldedKey(variable.variableName.value.view()), VariableInfo{id, *type});
         }
         dictionaryNames_.append(dictionary.DictionaryName);
         dictionaries_.push_back(std::move(dictionary));
@@ -167,8 +167,8 @@ bool UXmlReportTpl::FindVariable(const QString &dictionaryName, const QString &v
 /// The variables of all dictionaries of a name; null when there is none.
 const UXmlReportTpl::Variables *UXmlReportTpl::variablesOf(const QString &dictionaryName) const
 {
-    const auto found = variables_.constFind(foldedKey(dictionaryName));
-    return found == variables_.constEnd() ? nullptr : &*found;
+    const auto found = variables_.find(foldedKey(dictionaryName));
+    return found == variables_.end() ? nullptr : &found->second;
 }
 
 bool UXmlReportTpl::GetDicInfo(const Variables *variables, const QString &variableName, qint32 &id, qint32 &type)
@@ -176,12 +176,12 @@ bool UXmlReportTpl::GetDicInfo(const Variables *variables, const QString &variab
     if (variables == nullptr) {
         return false;
     }
-    const auto variable = variables->constFind(foldedKey(variableName));
-    if (variable == variables->constEnd()) {
+    const auto variable = variables->find(foldedKey(variableName));
+    if (variable == variables->end()) {
         return false;
     }
-    id = variable->id;
-    type = variable->type;
+    id = variable->second.id;
+    type = variable->second.type;
     return true;
 }
 

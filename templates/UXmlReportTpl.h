@@ -10,10 +10,11 @@
 #include "sXmlReportTemplateInfo.h"
 #include "sXmlSortTableReport.h"
 
-#include <QHash>
+#include <QHashFunctions>
 #include <QString>
 #include <QStringList>
 
+#include <unordered_map>
 #include <vector>
 
 /// One report template, read from a file that may hold several. Names are compared without regard to case.
@@ -83,7 +84,8 @@ private:
         qint32 id;
         qint32 type;
     };
-    using Variables = QHash<QString, VariableInfo>; ///< by their folded names; of several with one name, the last
+    using Variables =
+        std::unordered_map<QString, VariableInfo>; ///< by their folded names; of several with one name, the last
 
     const Variables *variablesOf(const QString &dictionaryName) const;
     static bool GetDicInfo(const Variables *variables, const QString &variableName, qint32 &id, qint32 &type);
@@ -99,7 +101,7 @@ private:
     std::vector<sXmlReportTemplateInfo> templates_;
     std::vector<sXmlSortTableReport> sortLists_;
     sXmlReportOption option_;
-    QHash<QString, Variables> variables_; ///< by the folded name of their dictionaries
+    std::unordered_map<QString, Variables> variables_; ///< by the folded name of their dictionaries
 
     friend class UXmlReportTplTest;
 };

@@ -26,7 +26,9 @@ void launchEditor(const QString &program, const QString &file, const QString &fo
     if (editorLauncher()) {
         editorLauncher()(launch);
     } else {
-        QProcess::startDetached(launch.program, {launch.file}, launch.folder);
+        QStringList arguments;
+        arguments.append(launch.file); // a list made of its members does not look whether there is memory
+        QProcess::startDetached(launch.program, arguments, launch.folder);
     }
 }
 

@@ -1,8 +1,9 @@
 #include "Profile.h"
 
-#include <QHash>
+#include <QHashFunctions>
 #include <QSettings>
 
+#include <unordered_map>
 #include <utility>
 
 namespace kareport
@@ -46,16 +47,17 @@ class MemoryProfile : public ProfileStore
 public:
     QString read(const QString &section, const QString &entry, const QString &fallback) const override
     {
-        return entries_.value(keyOf(section, entry), fallback);
+        const auto found = entries_.find(keyOf(section, entry));
+        return found != entries_.end() ? found->second : fallback;
     }
 
     void write(const QString &section, const QString &entry, const QString &value) override
     {
-        entries_.insert(keyOf(section, entry), value);
+        entries_.insert_or_assign(keyOf(section, entry), value);
     }
 
 private:
-    QHash<QString, QString> entries_;
+    std::unordered_map<QString, QString> entries_;
 };
 
 std::unique_ptr<ProfileStore> &currentStore()

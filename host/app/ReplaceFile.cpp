@@ -57,6 +57,11 @@ bool replaceFile(const QString &path, const std::function<bool(QIODevice &)> &wr
         reason = reason.isEmpty() ? whyWritingFails(file.handle()) : reason;
         return finish(false, error, reason.isEmpty() ? Xlate("not all of it could be written") : reason);
     }
+    // A commit passes over what the disk has refused only now, as disks of other machines do.
+    const QString reason = whySyncFails(file.handle());
+    if (!reason.isEmpty()) {
+        return finish(false, error, reason);
+    }
     return finish(file.commit(), error, file.errorString());
 }
 

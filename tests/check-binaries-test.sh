@@ -1,0 +1,74 @@
+#!/usr/bin/env bash
+# Builds programs that are wrong in one way each, and expects scripts/check-binaries.sh to say so.
+#
+#   check-binaries-test.sh COMPILER
+set -euo pipefail
+cd "$(dirname "$0")/.."
+compiler=$1
+
+folder=$(mktemp -d)
+trap 'rm -rf "$folder"' EXIT
+cat > "$folder/main.cpp" << 'END'
+#include <cstdio>
+#include <cstring>
+
+int main(int, char **argv)
+{
+    char name[64];
+    std::strcpy(name, argv[0]);
+    int (*const print)(const char *) = std::puts;
+    std::printf("%s\n", name);
+    return print(name) < 0;
+}
+END
+
+# shellcheck disable=SC2054 # the commas belong to the options
+good=(-O2 -U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=2 -fstack-protector-strong -fPIE -pie -Wl,-z,relro -Wl,-z,now)
+[ "$(uname -m)" != x86_64 ] || good+=(-fcf-protection)
+
+failed=0
+expect() { # what is said, empty for nothing; options of the check before "--", of the compiler after it
+    local said=$1 options=() output
+    shift
+    while [ "$1" != -- ]; do
+        options+=("$1")
+        shift
+    done
+    shift
+    "$compiler" "${good[@]}" "$@" -o "$folder/program" "$folder/main.cpp"
+    output=$(scripts/check-binaries.sh "${options[@]}" "$folder/program" || true)
+    if [ -z "$said" ] && [ -n "$output" ] || ! grep -qF -- "$said" <<< "$output"; then
+        printf 'with %s: "%s" was expected, this was said: %s\n' "$*" "$said" "$output"
+        failed=1
+    fi
+}
+
+# shellcheck disable=SC2016 # the loader replaces $ORIGIN
+{
+    expect '' --
+    expect '' -- -Wl,-rpath,'$ORIGIN'
+    expect '' -- -Wl,-rpath,'$ORIGIN/../lib:$ORIGIN'
+    expect 'an empty element' -- -Wl,-rpath,'$ORIGIN:'
+    expect 'an empty element' -- -Wl,-rpath,'$ORIGIN::$ORIGIN/../lib'
+    expect 'an empty element' -- -Wl,-rpath,':$ORIGIN'
+    expect 'an empty element' -- -Wl,--disable-new-dtags -Wl,-rpath,'$ORIGIN:'
+    expect 'the element "$ORIGINAL/lib"' -- -Wl,-rpath,'$ORIGINAL/lib'
+}
+expect 'the element "."' -- -Wl,-rpath,.
+expect 'the element "lib"' -- -Wl,-rpath,lib
+expect 'the element "/opt/lib"' -- -Wl,-rpath,/opt/lib
+expect 'the element "."' --paths-only -- -Wl,-rpath,.
+expect 'loaded at a fixed address' -- -no-pie -fno-pie
+expect 'no GNU_RELRO' -- -Wl,-z,norelro
+expect 'no BIND_NOW' -- -Wl,-z,lazy
+expect 'its stack can be executed' -- -Wl,-z,execstack
+expect 'no function guards its stack' -- -fno-stack-protector
+expect '_FORTIFY_SOURCE: printf' -- -U_FORTIFY_SOURCE -fno-builtin
+expect '' --paths-only -- -no-pie -fno-pie -fno-stack-protector -Wl,-z,lazy
+[ "$(uname -m)" != x86_64 ] || expect 'no endbr64' -- -fcf-protection=none
+
+if scripts/check-binaries.sh "$folder/main.cpp" > "$folder/said" || ! grep -q 'cannot be read' "$folder/said"; then
+    echo 'what is no program was taken for one'
+    failed=1
+fi
+exit $failed

@@ -1,0 +1,78 @@
+#include "FailingAllocationPosix.h"
+
+#include <cerrno>
+#include <cstddef>
+
+// What the C library itself calls its functions by, so that a program can put its own in their place.
+// NOLINTBEGIN(bugprone-reserved-identifier)
+extern "C" {
+void *__libc_malloc(std::size_t size);
+void *__libc_calloc(std::size_t count, std::size_t size);
+void *__libc_realloc(void *memory, std::size_t size);
+void *__libc_memalign(std::size_t alignment, std::size_t size);
+}
+
+namespace
+{
+
+thread_local constinit qint64 left = 0;
+thread_local constinit bool isRefused = false;
+
+bool refuses()
+{
+    if (left == 0 || --left > 0) {
+        return false;
+    }
+    isRefused = true;
+    errno = ENOMEM;
+    return true;
+}
+
+} // namespace
+
+// `operator new` of the standard library calls these as well.
+extern "C" {
+
+__attribute__((visibility("default"))) void *malloc(std::size_t size)
+{
+    return refuses() ? nullptr : __libc_malloc(size);
+}
+__attribute__((visibility("default"))) void *calloc(std::size_t count, std::size_t size)
+{
+    return refuses() ? nullptr : __libc_calloc(count, size);
+}
+__attribute__((visibility("default"))) void *realloc(void *memory, std::size_t size)
+{
+    return refuses() ? nullptr : __libc_realloc(memory, size);
+}
+__attribute__((visibility("default"))) void *aligned_alloc(std::size_t alignment, std::size_t size)
+{
+    return refuses() ? nullptr : __libc_memalign(alignment, size);
+}
+__attribute__((visibility("default"))) int posix_memalign(void **memory, std::size_t alignment, std::size_t size)
+{
+    void *made = refuses() ? nullptr : __libc_memalign(alignment, size);
+    if (made == nullptr) {
+        return ENOMEM;
+    }
+    *memory = made;
+    return 0;
+}
+}
+// NOLINTEND(bugprone-reserved-identifier)
+
+FailingAllocation::FailingAllocation(qint64 number)
+{
+    isRefused = false;
+    left = number;
+}
+
+FailingAllocation::~FailingAllocation()
+{
+    left = 0;
+}
+
+bool FailingAllocation::hasFailed() const
+{
+    return isRefused;
+}

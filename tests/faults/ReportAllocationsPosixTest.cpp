@@ -1,0 +1,453 @@
+#include "ReportSubject.h"
+
+#include "FrameFixture.h"
+
+#include <cstdio>
+#include <iterator>
+
+namespace
+{
+
+/// What becomes of the text when memory ends in an operation.
+enum class Text
+{
+    Same,     ///< it stays
+    Written,  ///< it stays, with a part of what was to be written after it; what is missing is known
+    Replaced, ///< it stays or is edited, nothing between
+    Set       ///< it is the new one, or empty and lost
+};
+
+struct Operation
+{
+    const char *name;
+    Text text;
+    bool (*act)(ReportSubject &subject, const Surroundings &around); ///< whether it says that all was done
+    Shape shape;
+    bool isSave = false; ///< to s.rep or s.rtf
+};
+
+bool lostNothing(const ReportSubject &s)
+{
+    return !s.report.HasLostText();
+}
+
+const QString line = QStringLiteral("a line that is long enough to need memory of its own");
+const QString wideLine = QStringLiteral("a line with \u6E2C in it");
+const QString blocks(70000, u'x');
+
+// What is not tried, because what is underneath does not survive it:
+// - `SetPageSize` on a printer, and with it the making of a report where there is one: Qt's fonts are measured with fontconfig,
+//   which does not look whether it got what it asked for, and Qt 6.4's own list of names, made of its members, does not
+//   either.
+// - `WritePdf` and saving as ".pdf": the faces of the document are looked for with fontconfig.
+// - Rich text that is shown or read: QTextDocument and what lays it out.
+constexpr Operation operations[] = {
+    {"Write", Text::Written, [](auto &s, auto &) { return s.report.Write(line, 0); }},
+    {"Write, UTF-16", Text::Written, [](auto &s, auto &) { return s.report.Write(wideLine, 1); }},
+    {"Write, a block", Text::Written, [](auto &s, auto &) { return s.report.Write(blocks, 1); }},
+    {"Write, unknown style", Text::Written, [](auto &s, auto &) { return s.report.Write(line, 7); }},
+    {"LineFeed", Text::Written,
+     [](auto &s, auto &) {
+         s.report.LineFeed(16000);
+         return lostNothing(s);
+     }},
+    {"NewPage", Text::Written, [](auto &s, auto &) { return s.report.NewPage(-1) && lostNothing(s); }},
+    {"WriteLine", Text::Written,
+     [](auto &s, auto &) {
+         s.report.WriteLine(line, 1, 2, 2);
+         return lostNothing(s);
+     }},
+    {"WriteLine, a new page", Text::Written,
+     [](auto &s, auto &) {
+         s.report.WriteLine(line, -1, 1, 0);
+         return lostNothing(s);
+     }},
+    {"WriteHeading", Text::Written,
+     [](auto &s, auto &) {
+         s.report.WriteHeading();
+         return lostNothing(s);
+     }},
+    {"WriteHeader", Text::Written,
+     [](auto &s, auto &) {
+         s.report.WriteHeader();
+         return lostNothing(s);
+     }},
+    {"WriteDataBlock",
+     Text::Written,
+     [](auto &s, auto &) { return s.report.WriteDataBlock(s.list.GetAt(0), 1, 1); },
+     {.isLoaded = true}},
+    {"WriteDataBlock by name",
+     Text::Written,
+     [](auto &s, auto &) { return s.report.WriteDataBlock(QStringLiteral("Site"), s.list.GetAt(0), 0, 0); },
+     {.isLoaded = true}},
+    {"WriteDataTable",
+     Text::Written,
+     [](auto &s, auto &) { return s.report.WriteDataTable(&s.list, 1, 1, -1); },
+     {.isLoaded = true}},
+    {"WriteDataTable by name",
+     Text::Written,
+     [](auto &s, auto &) { return s.report.WriteDataTable(QStringLiteral("Points"), &s.list, 0, 0, -1); },
+     {.isLoaded = true}},
+    {"LoadFile", Text::Written,
+     [](auto &s, auto &a) { return s.report.LoadFile(a.loadPath, false) == 1 && lostNothing(s); }},
+    {"OnOpenDocument", Text::Written, [](auto &s, auto &a) { return s.report.OnOpenDocument(a.loadPath); }},
+    {"SetData", Text::Set,
+     [](auto &s, auto &) {
+         s.report.SetData(line);
+         return lostNothing(s);
+     }},
+    {"SetData, UTF-16", Text::Set,
+     [](auto &s, auto &) {
+         s.report.SetData(wideLine);
+         return lostNothing(s);
+     }},
+    {"SetData, blocks", Text::Set,
+     [](auto &s, auto &) {
+         s.report.SetData(blocks);
+         return lostNothing(s);
+     }},
+    {"ReplaceText", Text::Replaced, [](auto &s, auto &) { return s.report.ReplaceText(2, 3, line); }},
+    {"ReplaceText, UTF-16", Text::Replaced, [](auto &s, auto &) { return s.report.ReplaceText(2, 3, wideLine); }},
+    {"ReplaceText, blocks", Text::Replaced, [](auto &s, auto &) { return s.report.ReplaceText(2, 3, blocks); }},
+    {"CopyText", Text::Same,
+     [](auto &s, auto &) {
+         s.answer = s.report.CopyText();
+         return !s.answer.isEmpty();
+     }},
+    {"GetText", Text::Same, [](auto &s, auto &) { return s.report.GetText().size() == s.report.GetTextLength(); }},
+    {"CheckSize", Text::Same, [](auto &s, auto &) { return s.report.CheckSize(200000) == 1; }},
+    {"WriteText", Text::Same,
+     [](auto &s, auto &) { return s.report.WriteText(s.bytes, kareport::LineEnds::ReportFile); }},
+    {"SetHeader", Text::Same,
+     [](auto &s, auto &) {
+         s.report.SetHeader();
+         return lostNothing(s);
+     }},
+    {"SetHeading", Text::Same,
+     [](auto &s, auto &) {
+         s.report.SetHeading(line, 1, 1);
+         return true;
+     }},
+    {"SetTitle",
+     Text::Same,
+     [](auto &s, auto &) {
+         s.report.SetTitle(line);
+         return lostNothing(s);
+     },
+     {.hasView = true}},
+    {"SetRTFDataFlag", Text::Same,
+     [](auto &s, auto &) {
+         s.report.SetRTFDataFlag(true);
+         return lostNothing(s);
+     }},
+    {"WriteRTFData", Text::Same,
+     [](auto &s, auto &) {
+         s.report.WriteRTFData(line, 1);
+         return lostNothing(s);
+     }},
+    {"GetRTFData", Text::Same,
+     [](auto &s, auto &) {
+         s.report.GetRTFData(s.answer);
+         return !s.answer.isEmpty();
+     }},
+    {"GetFontTableData", Text::Same,
+     [](auto &s, auto &) {
+         s.report.GetFontTableData(s.answer);
+         return !s.answer.isEmpty();
+     }},
+    {"WriteFontTable", Text::Same, [](auto &s, auto &) { return s.report.WriteFontTable(s.bytes); }},
+    {"WriteRichTextFile", Text::Same, [](auto &s, auto &) { return s.report.WriteRichTextFile(s.bytes); }},
+    {"ResetFormatString", Text::Same,
+     [](auto &s, auto &) {
+         s.answer = QStringLiteral("{\\rtf1\\viewkind4 text}");
+         const bool isCut = UReportDoc::ResetFormatString(s.answer);
+         return isCut == (s.answer == QStringLiteral("\\viewkind4 text")) && isCut;
+     }},
+    {"LoadSettings", Text::Same,
+     [](auto &s, auto &) {
+         s.report.LoadSettings();
+         return s.report.GetMargins() == QMargins(1000, 1000, 1200, 2000);
+     }},
+    {"SaveSettings", Text::Same,
+     [](auto &s, auto &) {
+         s.report.SaveSettings();
+         return true;
+     }},
+    {"LoadTemplateXml", Text::Same,
+     [](auto &s, auto &) {
+         return s.report.LoadTemplateXml(QStringLiteral("t.xml"), QStringLiteral("T"), QStringLiteral("Points"),
+                                         QStringLiteral("Site"));
+     }},
+    {"LoadTemplateTable",
+     Text::Same,
+     [](auto &s, auto &) { return s.report.LoadTemplateTable(QStringLiteral("Points")); },
+     {.isLoaded = true}},
+    {"LoadTemplateBlock",
+     Text::Same,
+     [](auto &s, auto &) { return s.report.LoadTemplateBlock(QStringLiteral("Site")); },
+     {.isLoaded = true}},
+    {"FormatXmlStringToDisplay",
+     Text::Same,
+     [](auto &s, auto &) {
+         const double value = 1.5;
+         s.answer = s.report.FormatXmlStringToDisplay(
+             &s.report.GetTemplate()->GetTable(QStringLiteral("Points"))->Fields[0], 8, &value, QString());
+         return !s.answer.isEmpty();
+     },
+     {.isLoaded = true}},
+    {"SaveFile", Text::Same, [](auto &s, auto &a) { return s.report.SaveFile(a.reportPath) == 1; }},
+    {"OnSaveDocument, .rep",
+     Text::Same,
+     [](auto &s, auto &a) { return s.report.OnSaveDocument(a.reportPath); },
+     {},
+     true},
+    {"OnSaveDocument, .rtf",
+     Text::Same,
+     [](auto &s, auto &a) { return s.report.OnSaveDocument(a.richTextPath); },
+     {.hasView = true},
+     true},
+    {"DoSave", Text::Same, [](auto &s, auto &a) { return s.report.DoSave(a.reportPath, false); }, {}, true},
+    {"GetCurrentReportFileName", Text::Same,
+     [](auto &s, auto &) { return !s.report.GetCurrentReportFileName().isEmpty(); }},
+    {"SaveText",
+     Text::Same,
+     [](auto &s, auto &) {
+         s.report.SetTextObject(&s, 1);
+         s.report.SaveText();
+         return true;
+     },
+     {.hasView = true}},
+    {"UpdateAllViews",
+     Text::Same,
+     [](auto &s, auto &) {
+         s.report.UpdateAllViews(nullptr);
+         return true;
+     },
+     {.hasView = true}},
+    {"UpdateAllViews, an editor",
+     Text::Same,
+     [](auto &s, auto &a) {
+         s.report.SetExternalEditorFlag(true);
+         s.report.UpdateAllViews(nullptr);
+         return !a.launches.all.empty();
+     },
+     {.hasView = true}},
+    {"ReportRTfData, an editor", Text::Same,
+     [](auto &s, auto &a) {
+         s.report.SetExternalEditorFlag(true);
+         s.report.ReportRTfData();
+         return !a.launches.all.empty();
+     }},
+    {"ConvertAndOpenInWord", Text::Same,
+     [](auto &s, auto &a) {
+         s.report.ConvertAndOpenInWord();
+         return !a.launches.all.empty();
+     }},
+};
+
+/// What an operation leaves of a report.
+struct Result
+{
+    QString text;
+    QString answer;
+    QByteArray bytes;
+};
+
+Result resultOf(const ReportSubject &subject)
+{
+    return {subject.report.CopyText(), subject.answer, subject.bytes.data()};
+}
+
+class ReportAllocations : public testing::TestWithParam<Operation>
+{
+protected:
+    ReportAllocations() { putFile(around_.loadPath, "\xEF\xBB\xBFTALVEN of a file\r\r\nline\r\r\n"); }
+
+    /// Does the operation with a request for memory failing. @return whether it failed
+    bool attempt(const Shape &shape, qint64 number, const Result &whole)
+    {
+        ReportSubject subject(shape);
+        UReportDoc &report = subject.report;
+        const QString before = report.CopyText();
+        putFile(around_.reportPath, "earlier");
+        putFile(around_.richTextPath, "earlier");
+        around_.launches.all.clear();
+        bool isDone = false;
+        bool hasFailed = false;
+        try {
+            const FailingAllocation failing(number);
+            isDone = GetParam().act(subject, around_);
+            hasFailed = failing.hasFailed();
+        } catch (...) {
+            ADD_FAILURE() << "allocation " << number << ": an exception comes out";
+            return true;
+        }
+        if (hasFailed) {
+            SCOPED_TRACE(testing::Message() << "allocation " << number << (shape.isRichText ? ", rich text" : "")
+                                            << (shape.hasWindow ? ", a window" : ""));
+            const Result result = resultOf(subject);
+            if (isDone) {
+                EXPECT_TRUE(result.text == whole.text) << "it says that all is done: " << result.text.toStdString();
+                EXPECT_TRUE(result.answer == whole.answer) << result.answer.toStdString();
+                EXPECT_TRUE(result.bytes == whole.bytes) << result.bytes.toStdString();
+            }
+            checkText(report, before, whole.text, isDone);
+            if (GetParam().isSave) {
+                const bool isEarlier =
+                    contentOf(around_.reportPath) == "earlier" && contentOf(around_.richTextPath) == "earlier";
+                EXPECT_EQ(isEarlier, !isDone) << "the file is not what the answer says";
+            }
+            checkUsable(report);
+        }
+        closeConverted();
+        return hasFailed && !HasFailure();
+    }
+
+    static void checkText(const UReportDoc &report, const QString &before, const QString &whole, bool isDone)
+    {
+        const QString text = report.CopyText();
+        switch (GetParam().text) {
+        case Text::Same: EXPECT_TRUE(text == before) << text.toStdString(); break;
+        case Text::Written:
+            EXPECT_TRUE(text.startsWith(before)) << text.toStdString();
+            EXPECT_TRUE(isDone || text == before || report.HasLostText()) << "half of it, and nobody knows";
+            break;
+        case Text::Replaced: EXPECT_TRUE(isDone || text == before) << text.toStdString(); break;
+        case Text::Set:
+            EXPECT_TRUE(isDone ? text == whole : text.isEmpty()) << text.toStdString();
+            EXPECT_EQ(report.HasLostText(), !isDone);
+            break;
+        }
+    }
+
+    void checkUsable(UReportDoc &report)
+    {
+        const QString text = report.CopyText();
+        EXPECT_TRUE(report.Write(QStringLiteral("after"), 0));
+        EXPECT_TRUE(report.CopyText() == text + QStringLiteral("after"));
+        if (report.HasLostText()) {
+            putFile(around_.reportPath, "earlier");
+            EXPECT_FALSE(report.OnSaveDocument(around_.reportPath)) << "half a report is saved";
+            EXPECT_EQ(contentOf(around_.reportPath), "earlier");
+        }
+        report.Clear();
+        EXPECT_TRUE(report.IsEmpty());
+        EXPECT_FALSE(report.HasLostText());
+    }
+
+    void closeConverted()
+    {
+        const auto &documents = around_.application.reportTemplate()->GetDocuments();
+        while (!documents.empty()) {
+            documents.back()->SetAutoDelete(true);
+            documents.back()->OnCloseDocument();
+        }
+    }
+
+    Surroundings around_;
+};
+
+TEST_P(ReportAllocations, AnyOfThemMayFail)
+{
+    const bool usesEditor = std::string(GetParam().name).find("ditor") != std::string::npos ||
+                            std::string(GetParam().name).find("Word") != std::string::npos;
+    SetUsePreferredReportEditorFlag(usesEditor);
+    for (const auto &[isRichText, hasWindow] :
+         {std::pair(false, false), std::pair(true, false), std::pair(false, true), std::pair(true, true)})
+    {
+        Shape shape = GetParam().shape;
+        shape.isRichText = isRichText;
+        shape.hasWindow = hasWindow;
+        Result whole;
+        {
+            // Once as it should be; what is made only once in a program is made then.
+            ReportSubject subject(shape);
+            around_.launches.all.clear();
+            ASSERT_TRUE(GetParam().act(subject, around_)) << "it does not work at all";
+            whole = resultOf(subject);
+            closeConverted();
+        }
+        failingEachAllocation([&](qint64 number) { return attempt(shape, number, whole); });
+        if (HasFailure()) {
+            return;
+        }
+    }
+}
+
+std::string nameOf(const testing::TestParamInfo<Operation> &info)
+{
+    std::string name;
+    bool isNext = false;
+    for (const char letter : std::string(info.param.name)) {
+        if (std::isalnum(static_cast<unsigned char>(letter)) == 0) {
+            isNext = true;
+            continue;
+        }
+        name += isNext ? static_cast<char>(std::toupper(static_cast<unsigned char>(letter))) : letter;
+        isNext = false;
+    }
+    return name;
+}
+
+void PrintTo(const Operation &operation, std::ostream *out)
+{
+    *out << operation.name;
+}
+
+INSTANTIATE_TEST_SUITE_P(Operations, ReportAllocations, testing::ValuesIn(operations), nameOf);
+
+TEST(ReportAllocation, DataThatIsNotWrittenWholeLeavesNoHeading)
+{
+    const Surroundings around;
+    for (const bool isTable : {true, false}) {
+        failingEachAllocation([&](qint64 number) {
+            ReportSubject subject({.isRichText = true, .isLoaded = true});
+            bool isWritten = false;
+            bool hasFailed = false;
+            {
+                const FailingAllocation failing(number);
+                isWritten = isTable ? subject.report.WriteDataTable(&subject.list, 0, 0, -1)
+                                    : subject.report.WriteDataBlock(subject.list.GetAt(0), 0, 0);
+                hasFailed = failing.hasFailed();
+            }
+            EXPECT_EQ(isWritten, !subject.report.HasLostText()) << number;
+            const qint64 written = subject.report.GetTextLength();
+            subject.report.NewPage(-1);
+            const QString page = subject.report.CopyText().sliced(written);
+            EXPECT_TRUE(page.contains(QStringLiteral("TALVEN - Title"))) << number;
+            EXPECT_FALSE(page.contains(QStringLiteral("Heading"))) << number << ": what was set before";
+            EXPECT_FALSE(page.contains(QStringLiteral("Point"))) << number << ": of the table";
+            return hasFailed && !testing::Test::HasFailure();
+        });
+    }
+}
+
+TEST(ReportAllocation, WithoutMemoryThereIsNoNewReport)
+{
+    const Surroundings around;
+    const auto &documents = around.application.reportTemplate()->GetDocuments();
+    const auto create = [](qint64 number, bool &hasFailed) {
+        const FailingAllocation failing(number);
+        UReportDoc *report = CreateReport(QStringLiteral("a name of a report"), true, false, nullptr, 0, nullptr);
+        hasFailed = failing.hasFailed();
+        return report;
+    };
+    bool hasFailed = false;
+    ASSERT_NE(create(0, hasFailed), nullptr);
+    const qint64 allocations = failingEachAllocation([&](qint64 number) {
+        const std::size_t before = documents.size();
+        const UReportDoc *report = nullptr;
+        EXPECT_NO_THROW(report = create(number, hasFailed)) << number;
+        EXPECT_EQ(documents.size(), before + (report != nullptr ? 1 : 0)) << number;
+        if (report != nullptr) {
+            EXPECT_FALSE(report->HasLostText()) << number;
+            EXPECT_EQ(report->GetTitle().left(4), QStringLiteral("a na")) << number;
+            EXPECT_EQ(report->GetReportFileName(), QStringLiteral("a name of a report")) << number;
+            documents.back()->OnCloseDocument();
+        }
+        return hasFailed && !testing::Test::HasFailure();
+    });
+    EXPECT_GT(allocations, 5);
+}
+
+} // namespace

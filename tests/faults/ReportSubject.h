@@ -1,0 +1,116 @@
+#pragma once
+
+#include "DataReport.h"
+#include "EditorFixture.h"
+#include "FailingAllocationPosix.h"
+#include "TemporaryFolder.h"
+
+#include <QBuffer>
+
+#include <memory>
+
+/// What all reports of these tests share: files, an editor that is only recorded, an application.
+class Surroundings
+{
+public:
+    Surroundings() : editor(QStringLiteral("editor"))
+    {
+        folders_.putIntoLibrary(markup::surveyTemplate(
+            markup::output("Table", "Points", "Survey", {markup::field("Number", "Point", "12")}, {"Number"}),
+            markup::output("Block", "Site", "Survey",
+                           {markup::field("Number", "Point", "12"), markup::field("Note", "Note", "30")}),
+            markup::separatorOption("124")));
+        SetUsePreferredReportEditorFlag(false);
+        kareport::setDefaultPrinter({kareport::PrinterSource::None}); // no font is measured: see "What is not tried"
+    }
+
+private:
+    FixedSurroundings surroundings_;
+    TemplateFolders folders_;
+    TemporaryFolder folder_;
+
+public:
+    RecordedLaunches launches;
+    const PreferredEditor editor;
+    const QString loadPath = folder_.at(QStringLiteral("a.rep"));
+    const QString reportPath = folder_.at(QStringLiteral("s.rep"));
+    const QString richTextPath = folder_.at(QStringLiteral("s.rtf"));
+    ReportApplication application;
+};
+
+/// How a report is made before something is done with it.
+struct Shape
+{
+    bool isRichText = false;
+    bool hasWindow = false;
+    bool hasView = false;
+    bool isLoaded = false; ///< with its template, table and block
+};
+
+/// A report that holds a line, and what an operation on it needs.
+class ReportSubject
+{
+public:
+    explicit ReportSubject(const Shape &shape)
+    {
+        report.SetAutoDelete(false);
+        report.FixPage(20, 80);
+        report.SetHeaderFlag(true);
+        report.SetTitle(QStringLiteral("Title of a report"));
+        // Each its own, so that its temporary names are free.
+        static int number = 0;
+        report.SetReportFileName(QStringLiteral("report%1").arg(++number));
+        report.SetRTFDataFlag(shape.isRichText);
+        if (shape.hasWindow) {
+            window_ = new TestReportWindow;
+            report.SetReportWindow(window_);
+        }
+        if (shape.hasView) {
+            pane_ = new CountingPane;
+            showIn<TestReportView>(*pane_, report);
+        }
+        if (shape.isLoaded) {
+            EXPECT_TRUE(report.LoadTemplateXml(QStringLiteral("t.xml"), QStringLiteral("T"), QStringLiteral("Points"),
+                                               QStringLiteral("Site")));
+        }
+        for (const char *name : {"first", "second", "third"}) {
+            UDataObject &object = list.Add();
+            object.Set(1, UPointNumber(QString::fromUtf8(name)));
+            object.Set(6, QStringLiteral("a note"));
+        }
+        report.WriteLine(QStringLiteral("before"), 0, 1, 0);
+        report.SetHeading(QStringLiteral("Heading"), 1, 1);
+        bytes.open(QIODevice::ReadWrite);
+    }
+    ~ReportSubject()
+    {
+        if (pane_ != nullptr) {
+            pane_->ClosePane();
+        }
+    }
+    ReportSubject(const ReportSubject &) = delete;
+    ReportSubject &operator=(const ReportSubject &) = delete;
+
+    UReportDoc report;
+    UDataObjectList list;
+    QString answer; ///< what an operation gives back
+    QBuffer bytes;
+
+private:
+    TestReportWindow *window_ = nullptr; ///< the report's
+    CountingPane *pane_ = nullptr;
+};
+
+/// Does something again and again, with its first request for memory failing, then with its second, until it needs no more
+/// of them. @param attempt  is given the number of the request, and says whether it failed
+template <typename Attempt>
+qint64 failingEachAllocation(Attempt attempt)
+{
+    constexpr qint64 most = 100000;
+    qint64 number = 1;
+    while (number < most && attempt(number)) {
+        ++number;
+    }
+    EXPECT_LT(number, most) << "it does not come to an end";
+    return number - 1;
+}
