@@ -192,7 +192,7 @@ QString World::checkActive() const
     const std::vector<UReportView *> shown = viewsOnScreen();
     const COneViewPane *pane = frame_->GetActivePane();
     const QDockWidget *dock = pane != nullptr ? pane->GetDock() : nullptr;
-    if (!shown.empty() && (dock == nullptr || dock->visibleRegion().isEmpty())) {
+    if (!shown.empty() && (dock == nullptr || !pane->IsInFront())) {
         return QStringLiteral("a report is on the screen, and no pane on the screen is active");
     }
     const auto *active = dynamic_cast<UReportView *>(frame_->GetActiveView());
