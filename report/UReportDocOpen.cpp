@@ -101,6 +101,7 @@ void UReportDoc::readLines(QIODevice &file, bool mayBeRichText, bool keepLineEnd
     bool isRichText = false;
     bool isFirst = true;
     bool isOpen = false;
+    const qint64 before = GetTextLength();
     while (reader.next()) {
         QLatin1StringView line = reader.piece();
         if (std::exchange(isFirst, false)) {
@@ -126,4 +127,5 @@ void UReportDoc::readLines(QIODevice &file, bool mayBeRichText, bool keepLineEnd
         page_.lineFeed(1);
         page_.countLine();
     }
+    FindPageStarts(before); // the pages that it was written in, not those that its lines would fill now
 }

@@ -120,6 +120,10 @@ private:
     void WrapChanged();
     bool loadInPieces();
     void noteMirrored();
+    std::vector<int> pageStartLines() const;
+    void followPages(const kareport::ReportChange &change);
+    bool carryThrough(const kareport::ReportChange &change);
+    void takeText();
     QRect printableRect() const; ///< twips
     void prepareRun(QPaintDevice *device);
     /// The sheets of a report whose page was given; empty where the lines flow from sheet to sheet.
