@@ -46,7 +46,13 @@ std::vector<int> UReportView::pageStartLines() const
         const QString shown = edit_->windowText();
         return asLines(kareport::linesOfStarts(shown, kareport::pageHeadersIn(shown)), lineCount);
     }
-    return asLines(report->GetPageStartLines(), lineCount);
+    // Found once, also while the control gets its text piece by piece.
+    if (startLinesLength_ != report->GetTextLength() || startLinesEdits_ != report->GetEditCount()) {
+        startLines_ = report->GetPageStartLines();
+        startLinesLength_ = report->GetTextLength();
+        startLinesEdits_ = report->GetEditCount();
+    }
+    return asLines(startLines_, lineCount);
 }
 
 void UReportView::followPages(const ReportChange &change)
