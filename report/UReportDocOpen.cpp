@@ -127,5 +127,9 @@ void UReportDoc::readLines(QIODevice &file, bool mayBeRichText, bool keepLineEnd
         page_.lineFeed(1);
         page_.countLine();
     }
-    FindPageStarts(before); // the pages that it was written in, not those that its lines would fill now
+    if (isRichText) {
+        SetPageStarts({}); // pages are those of the text that is shown
+    } else {
+        FindPageStarts(before); // those that it was written in, not those that its lines would fill now
+    }
 }

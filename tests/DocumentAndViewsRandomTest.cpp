@@ -321,7 +321,7 @@ private:
         isModified_ = true;
     }
 
-    void followText(const ReportEdit &edit)
+    void followText(ReportEdit &edit)
     {
         const std::vector<qint64> starts = report().GetPageStarts();
         model_.setData(edit.windowText());

@@ -34,13 +34,14 @@ QStringList savedLines()
 TEST(SavedReportPages, AReopenedReportHasThePagesThatItWasWrittenIn)
 {
     const JobFolder files;
-    files.put("a.rep", savedLines().join(QStringLiteral("\r\r\n")).toUtf8());
+    files.put("a.rep", "\xEF\xBB\xBF" + savedLines().join(QStringLiteral("\r\r\n")).toUtf8());
+    files.put("cr.rep", savedLines().join(QStringLiteral("\r\r\n")).toUtf8()); // a text with returns in it
     files.put("a.rtf", ("{\\rtf1\\ansi{\\fonttbl{\\f0 Courier;}}\\f0 " + savedLines().join(QStringLiteral("\\par\n")) +
                         QStringLiteral("\\par}"))
                            .toLatin1());
     Desk desk;
     desk.answer = MessageAnswer::No;
-    for (const char *name : {"a.rep", "a.rtf"}) {
+    for (const char *name : {"a.rep", "cr.rep", "a.rtf"}) {
         UReportDoc *report = kareport::openSavedReport(files.path(name));
         ASSERT_NE(report, nullptr) << name;
         for (int turn = 0; turn < 2; ++turn) {

@@ -178,6 +178,7 @@ bool UReportView::loadInPieces()
     isMirrored_ = false;
     showsFormats_ = false;
     noteLoaded();
+    forgetPages();
     // What a host appends meanwhile is shown with its next update. Any other change begins the load anew.
     const quint64 edits = report->GetEditCount();
     const auto read = [report, edits](qint64 at, qint64 count) {

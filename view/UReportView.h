@@ -121,6 +121,7 @@ private:
     bool loadInPieces();
     void noteMirrored();
     std::vector<int> pageStartLines() const;
+    void forgetPages();
     void followPages(const kareport::ReportChange &change);
     bool carryThrough(const kareport::ReportChange &change);
     void takeText();

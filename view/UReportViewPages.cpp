@@ -30,6 +30,28 @@ std::vector<int> asLines(const std::vector<qint64> &lines, int lineCount)
     return shown;
 }
 
+/// The blocks of a control that pages of a text begin with. Other line ends than CR LF are one character there.
+std::vector<int> blocksOfStarts(const QString &text, const std::vector<qint64> &starts)
+{
+    std::vector<int> blocks;
+    int block = 0;
+    qint64 at = 0;
+    for (const qint64 start : starts) {
+        for (; at < std::min<qint64>(start, text.size()); ++at) {
+            const QChar character = text[at];
+            const bool isPairsFirst = character == u'\r' && at + 1 < text.size() && text[at + 1] == u'\n';
+            block +=
+                (character == u'\r' && !isPairsFirst) || character == u'\n' || character == QChar::ParagraphSeparator
+                    ? 1
+                    : 0;
+        }
+        if (at < text.size() && (at == 0 || text[at - 1] == u'\n')) {
+            blocks.push_back(block);
+        }
+    }
+    return blocks;
+}
+
 } // namespace
 
 std::vector<int> UReportView::pageStartLines() const
@@ -46,6 +68,9 @@ std::vector<int> UReportView::pageStartLines() const
         const QString shown = edit_->windowText();
         return asLines(kareport::linesOfStarts(shown, kareport::pageHeadersIn(shown)), lineCount);
     }
+    if (!isImage && !isMirrored_ && !edit_->isLoading()) {
+        return blocksOfStarts(report->CopyText(), report->GetPageStarts());
+    }
     // Found once, also while the control gets its text piece by piece.
     if (startLinesLength_ != report->GetTextLength() || startLinesEdits_ != report->GetEditCount()) {
         startLines_ = report->GetPageStartLines();
@@ -53,6 +78,12 @@ std::vector<int> UReportView::pageStartLines() const
         startLinesEdits_ = report->GetEditCount();
     }
     return asLines(startLines_, lineCount);
+}
+
+void UReportView::forgetPages()
+{
+    startLinesLength_ = -1;
+    static_cast<ReportViewWidget *>(widget_.data())->forgetPages();
 }
 
 void UReportView::followPages(const ReportChange &change)
