@@ -5,6 +5,7 @@
 #include <QHash>
 
 #include <algorithm>
+#include <iterator>
 #include <utility>
 
 namespace kareport
@@ -13,7 +14,7 @@ namespace kareport
 namespace
 {
 
-constexpr std::size_t mostPieces = 256;
+constexpr std::size_t mostRecords = 256;
 constexpr std::size_t otherSeed = 0x9E3779B9;
 
 /// What an edit changes, without what is the same at both ends of the removed and of the inserted text: controls report
@@ -46,27 +47,46 @@ void sortOut(std::vector<qint64> &positions)
 
 } // namespace
 
-PageStarts::Piece PageStarts::Piece::of(qint64 at, QStringView text)
+PageStarts::Piece PageStarts::Piece::of(QStringView text)
 {
-    return {at, text.size(), qHash(text), qHash(text, otherSeed), {}};
+    return {text.size(), qHash(text), qHash(text, otherSeed)};
 }
 
-bool PageStarts::Piece::holdsSame(const Piece &other) const
-{
-    return length == other.length && hash == other.hash && otherHash == other.otherHash;
-}
-
-bool PageStarts::Piece::bringsPages() const
+bool PageStarts::Record::bringsPages() const
 {
     // A line end alone, or a character, is what anybody types anywhere.
-    return length > 2 ||
-           std::any_of(offsets.begin(), offsets.end(), [this](qint64 offset) { return offset > 0 && offset < length; });
+    return inserted.length == 0 &&
+           (removed.length > 2 || std::any_of(before.begin(), before.end(),
+                                              [this](qint64 offset) { return offset > 0 && offset < removed.length; }));
+}
+
+const PageStarts::Record *PageStarts::inverseOf(const Record &edit) const
+{
+    const auto isInverse = [&edit](const Record &record) {
+        return record.at == edit.at && record.inserted == edit.removed && record.removed == edit.inserted &&
+               record.after == edit.before;
+    };
+    const auto found = std::find_if(records_.rbegin(), records_.rend(), isInverse);
+    return found == records_.rend() ? nullptr : &*found;
+}
+
+std::vector<qint64> PageStarts::broughtBy(const Record &edit) const
+{
+    std::vector<qint64> brought;
+    const auto found = std::find_if(records_.rbegin(), records_.rend(), [&edit](const Record &record) {
+        return record.removed == edit.inserted && record.bringsPages();
+    });
+    if (found != records_.rend()) {
+        std::copy_if(found->before.begin(), found->before.end(), std::back_inserter(brought),
+                     [&found](qint64 offset) { return offset < found->removed.length; });
+    }
+    return brought;
 }
 
 void PageStarts::clear()
 {
     positions_.clear();
-    pieces_.clear();
+    records_.clear();
 }
 
 void PageStarts::assign(std::vector<qint64> positions)
@@ -75,7 +95,7 @@ void PageStarts::assign(std::vector<qint64> positions)
                     positions.end());
     sortOut(positions);
     positions_ = std::move(positions);
-    pieces_.clear();
+    records_.clear();
 }
 
 void PageStarts::add(qint64 at)
@@ -94,75 +114,78 @@ bool PageStarts::wantsRemoved(qint64 at, qint64 removed, qint64 inserted) const
     return inserted > 0 || (first != positions_.end() && *first <= at + removed);
 }
 
-PageStarts::Edit PageStarts::prepare(qint64 at, qint64 removed, QStringView removedText, QStringView inserted)
+PageStarts::Edit PageStarts::prepare(qint64 at, qint64 removed, QStringView removedText, QStringView inserted,
+                                     bool beginsLine)
 {
-    Edit edit;
-    const auto first = std::lower_bound(positions_.begin(), positions_.end(), at);
-    const auto last = std::upper_bound(first, positions_.end(), at + removed);
-    edit.first = static_cast<std::size_t>(first - positions_.begin());
-    edit.last = static_cast<std::size_t>(last - positions_.begin());
-    edit.growth = inserted.size() - removed;
     const bool isSeen = !removedText.isEmpty();
     const Difference changed = isSeen ? differenceOf(at, removedText, inserted) : Difference{at, {}, inserted};
+    const auto first = std::lower_bound(positions_.begin(), positions_.end(), at);
+    const auto last = std::upper_bound(first, positions_.end(), at + removed);
+    Edit edit;
+    edit.first = static_cast<std::size_t>(first - positions_.begin());
+    edit.last = static_cast<std::size_t>(last - positions_.begin());
     edit.at = changed.at;
     edit.removed = isSeen ? changed.removed.size() : removed;
+    edit.growth = inserted.size() - removed;
+
+    // Starts beside what differs keep their places in the text.
     const qint64 end = edit.at + edit.removed;
-    const qint64 newEnd = end + edit.growth;
-    const auto isTouched = [&](qint64 start) { return start >= edit.at && start <= end; };
-
-    // What was removed before comes back with its pages.
-    std::vector<qint64> brought;
-    if (!pieces_.empty() && !changed.inserted.isEmpty()) {
-        const Piece put = Piece::of(edit.at, changed.inserted);
-        const auto same =
-            std::find_if(pieces_.rbegin(), pieces_.rend(), [&put](const Piece &piece) { return piece.holdsSame(put); });
-        if (same != pieces_.rend()) {
-            const bool wasAtEnd = same->offsets.front() == 0 || same->offsets.back() == same->length;
-            if (same->at == put.at && (!wasAtEnd || std::any_of(first, last, isTouched))) {
-                edit.undone = static_cast<std::size_t>(pieces_.rend() - same) - 1;
-            }
-            for (const qint64 offset : same->offsets) {
-                if (edit.undone || (same->bringsPages() && offset < same->length)) {
-                    brought.push_back(edit.at + offset);
-                }
-            }
-        }
-    }
-    if (!edit.undone) {
-        for (const qint64 header : pageHeadersIn(inserted)) {
-            brought.push_back(at + header);
-        }
-    }
-
-    const bool isBroughtFirst = std::find(brought.begin(), brought.end(), edit.at) != brought.end();
-    const bool isBefore = isBroughtFirst || (edit.at > 0 && changed.inserted.endsWith(u'\n'));
+    Record record;
+    record.at = edit.at;
     for (auto start = first; start != last; ++start) {
-        if (!isTouched(*start)) {
+        if (*start >= edit.at && *start <= end) {
+            record.before.push_back(*start - edit.at);
+        } else {
             edit.middle.push_back(*start < edit.at ? *start : *start + edit.growth);
-        } else if (edit.undone) {
-            continue;
-        } else if (edit.removed == 0) {
-            edit.middle.push_back(isBefore ? newEnd : edit.at);
-        } else if (*start == edit.at) {
-            edit.middle.push_back(edit.at);
-        } else if (*start == end) {
-            edit.middle.push_back(newEnd);
         }
     }
-    edit.middle.insert(edit.middle.end(), brought.begin(), brought.end());
+    std::vector<qint64> headers = pageHeadersIn(inserted);
+    if (!beginsLine && !headers.empty() && headers.front() == 0) {
+        headers.erase(headers.begin()); // the end of one
+    }
+    if (!records_.empty() || !record.before.empty() || !headers.empty()) {
+        record.removed = Piece::of(changed.removed);
+        record.inserted = Piece::of(changed.inserted);
+    }
+    if (const Record *undone = inverseOf(record)) {
+        edit.undone = static_cast<std::size_t>(undone - records_.data());
+        record.after = undone->before;
+    } else {
+        record.after = broughtBy(record);
+        for (const qint64 header : headers) {
+            const qint64 offset = at + header - edit.at;
+            offset >= 0 && offset < changed.inserted.size() ? record.after.push_back(offset)
+                                                            : edit.middle.push_back(at + header);
+        }
+        carry(record, edit.removed, changed.inserted);
+    }
+    for (const qint64 offset : record.after) {
+        edit.middle.push_back(edit.at + offset);
+    }
     sortOut(edit.middle);
 
-    if (isSeen && edit.removed > 0 && std::any_of(first, last, isTouched)) {
-        edit.removedPiece = Piece::of(edit.at, changed.removed);
-        for (auto start = first; start != last; ++start) {
-            if (isTouched(*start)) {
-                edit.removedPiece->offsets.push_back(*start - edit.at);
-            }
-        }
-        pieces_.reserve(mostPieces + 1);
+    if (!record.before.empty() || !record.after.empty()) {
+        edit.record = std::move(record);
+        records_.reserve(mostRecords + 1);
     }
     positions_.reserve(positions_.size() + edit.middle.size());
     return edit;
+}
+
+void PageStarts::carry(Record &record, qint64 removed, QStringView inserted)
+{
+    const bool isFirstBrought = std::find(record.after.begin(), record.after.end(), 0) != record.after.end();
+    const bool isBefore = isFirstBrought || (record.at > 0 && inserted.endsWith(u'\n'));
+    for (const qint64 offset : record.before) {
+        if (removed == 0) {
+            record.after.push_back(isBefore ? inserted.size() : 0);
+        } else if (offset == 0) {
+            record.after.push_back(0);
+        } else if (offset == removed) {
+            record.after.push_back(inserted.size());
+        }
+    }
+    sortOut(record.after);
 }
 
 void PageStarts::carryOut(Edit &&edit) noexcept
@@ -174,21 +197,22 @@ void PageStarts::carryOut(Edit &&edit) noexcept
     }
     positions_.insert(behind, edit.middle.begin(), edit.middle.end());
 
+    // The places of earlier edits move as well. Those at the place of an inverse are where they were before its edit.
     const qint64 end = edit.at + edit.removed;
-    for (Piece &piece : pieces_) {
-        if (piece.at > end || (piece.at == end && (edit.removed > 0 || !edit.undone))) {
-            piece.at += edit.growth;
-        } else if (piece.at > edit.at) {
-            piece.at = edit.at;
+    for (Record &record : records_) {
+        if (record.at > end || (record.at == end && (edit.removed > 0 || !edit.undone))) {
+            record.at += edit.growth;
+        } else if (record.at > edit.at) {
+            record.at = edit.at;
         }
     }
     if (edit.undone) {
-        pieces_.erase(pieces_.begin() + static_cast<std::ptrdiff_t>(*edit.undone));
+        records_.erase(records_.begin() + static_cast<std::ptrdiff_t>(*edit.undone));
     }
-    if (edit.removedPiece) {
-        pieces_.push_back(std::move(*edit.removedPiece));
-        if (pieces_.size() > mostPieces) {
-            pieces_.erase(pieces_.begin());
+    if (edit.record) {
+        records_.push_back(std::move(*edit.record));
+        if (records_.size() > mostRecords) {
+            records_.erase(records_.begin());
         }
     }
 }

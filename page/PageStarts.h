@@ -27,33 +27,48 @@ public:
     /// Begins a page at the end of the text.
     void add(qint64 at);
 
+    struct Edit;
     /// Carries the starts along with an edit of the text, in two steps: `prepare` needs memory and is called before the
     /// text changes, `carryOut` cannot fail.
     ///
-    /// A start whose text before it is removed stays with its page. An inserted piece brings pages along where page
-    /// headers stand in it, or where it is the very piece that was removed together with them. Text put in at a page's
-    /// start belongs to the page before when it ends with a line end, else to the page.
-    struct Edit;
+    /// A start whose text before it is removed stays with its page. Text put in at a page's start belongs to the page
+    /// before when it ends with a line end, else to the page. An inserted piece brings pages along where page headers
+    /// stand in it, or where it was removed together with them. The exact inverse of an edit, which is what an undo is,
+    /// gives the starts back that there were.
+    /// @param removedText  what is removed; empty where `wantsRemoved` says no
+    /// @param beginsLine   whether the place is the beginning of a line. Looked at only where the first line that is
+    ///                     inserted is a page header, which is longer than `shortestHeader`
+    Edit prepare(qint64 at, qint64 removed, QStringView removedText, QStringView inserted, bool beginsLine);
+    static constexpr qint64 shortestHeader = 20;
     /// Whether `prepare` wants to see what is removed.
     bool wantsRemoved(qint64 at, qint64 removed, qint64 inserted) const;
-    /// @param removedText  what is removed; empty where `wantsRemoved` says no
-    Edit prepare(qint64 at, qint64 removed, QStringView removedText, QStringView inserted);
     void carryOut(Edit &&edit) noexcept;
 
 private:
-    /// A piece that was removed with the starts at it: an undo puts the very same piece in again.
+    /// A text, known again by its length and two hashes.
     struct Piece
     {
-        qint64 at = 0;
         qint64 length = 0;
         std::size_t hash = 0;
         std::size_t otherHash = 0;
-        std::vector<qint64> offsets; ///< of the starts, from 0 to the length
 
-        static Piece of(qint64 at, QStringView text);
-        bool holdsSame(const Piece &other) const;
+        static Piece of(QStringView text);
+        bool operator==(const Piece &other) const = default;
+    };
+    /// An edit that starts were touched by: where they were before and after it, counted from its place.
+    struct Record
+    {
+        qint64 at = 0;
+        Piece removed;
+        Piece inserted;
+        std::vector<qint64> before;
+        std::vector<qint64> after;
+
         bool bringsPages() const;
     };
+    const Record *inverseOf(const Record &edit) const;
+    std::vector<qint64> broughtBy(const Record &edit) const;
+    static void carry(Record &record, qint64 removed, QStringView inserted);
 
 public:
     struct Edit
@@ -64,13 +79,13 @@ public:
         qint64 at = 0;
         qint64 removed = 0;
         qint64 growth = 0;
-        std::optional<std::size_t> undone; ///< the piece that comes back to its place
-        std::optional<Piece> removedPiece;
+        std::optional<std::size_t> undone; ///< the record that it is the inverse of
+        std::optional<Record> record;
     };
 
 private:
     std::vector<qint64> positions_;
-    std::vector<Piece> pieces_; ///< the oldest first
+    std::vector<Record> records_; ///< the oldest first
 };
 
 } // namespace kareport

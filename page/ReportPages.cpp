@@ -134,6 +134,11 @@ std::vector<qint64> findStarts(View text, const std::vector<qint64> &lines)
 
 } // namespace
 
+bool isBlankLine(QStringView line)
+{
+    return std::all_of(line.begin(), line.end(), isBlank);
+}
+
 std::vector<ReportPage> reportPages(QStringView text, const std::vector<qint64> &starts, int linesPerPage)
 {
     return cut(text, starts, linesPerPage);

@@ -18,6 +18,9 @@ struct ReportPage
     qint64 lines = 0; ///< from `begin` to `end`; 0 for a blank page
 };
 
+/// Whether a line has nothing that a page shows.
+KAREPORT_EXPORT bool isBlankLine(QStringView line);
+
 /// The pages of a text, in order: whatever shows, prints or saves pages asks here.
 ///
 /// A page begins at each recorded start that stands at the beginning of a line. Text before the first of them, and a text

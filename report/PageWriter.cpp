@@ -128,13 +128,18 @@ void PageWriter::lineFeed(qint64 count)
 
 bool PageWriter::replace(qint64 at, qint64 removed, QStringView inserted)
 {
+    if (at < 0 || removed < 0 || at > text_.size() || removed > text_.size() - at) {
+        return false;
+    }
     return whileMemoryLasts(false, [&] {
         if (text_.owns(inserted)) {
             return replace(at, removed, inserted.toString());
         }
         const bool wantsRemoved = starts_.wantsRemoved(at, removed, inserted.size());
         const QString removedText = wantsRemoved ? text_.piece(at, removed) : QString();
-        PageStarts::Edit edit = starts_.prepare(at, removed, removedText, inserted);
+        const bool mayBeHeader = inserted.size() > PageStarts::shortestHeader;
+        const bool beginsLine = at == 0 || (mayBeHeader && text_.piece(at - 1, 1) == u"\n");
+        PageStarts::Edit edit = starts_.prepare(at, removed, removedText, inserted, beginsLine);
         if (!text_.replace(at, removed, inserted)) {
             return false;
         }

@@ -101,6 +101,7 @@ void UReportDoc::readLines(QIODevice &file, bool mayBeRichText, bool keepLineEnd
     bool isRichText = false;
     bool isFirst = true;
     bool isOpen = false;
+    const qint64 before = GetTextLength();
     while (reader.next()) {
         QLatin1StringView line = reader.piece();
         if (std::exchange(isFirst, false)) {
@@ -125,5 +126,10 @@ void UReportDoc::readLines(QIODevice &file, bool mayBeRichText, bool keepLineEnd
     if (isOpen) {
         page_.lineFeed(1);
         page_.countLine();
+    }
+    if (isRichText) {
+        SetPageStarts({}); // pages are those of the text that is shown
+    } else {
+        FindPageStarts(before); // those that it was written in, not those that its lines would fill now
     }
 }

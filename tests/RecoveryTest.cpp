@@ -3,6 +3,7 @@
 #include "FrameFixture.h"
 #include "Recovery.h"
 #include "ReportEdit.h"
+#include "ReportViewWidget.h"
 #include "UReportView.h"
 
 #include <QDir>
@@ -115,6 +116,41 @@ TEST(Recovery, WhatWasOpenComesBackAfterACrash)
 
     recovery.discardLeft();
     EXPECT_TRUE(Recovery(folder.path()).leftReports().empty());
+}
+
+TEST(Recovery, PagesComeBack)
+{
+    const JobFolder files;
+    const CrashFolder folder;
+    std::vector<qint64> starts;
+    {
+        Desk desk;
+        desk.answer = MessageAnswer::No;
+        auto recovery = std::make_unique<Recovery>(folder.path());
+        UReportDoc *report = makeReport(QStringLiteral("R"), QString());
+        report->FixPage(7, 80);
+        for (int page = 0; page < 4; ++page) {
+            report->NewPage(-1);
+            report->WriteLine(QStringLiteral("line of a page without header"), 0, 1, 0);
+        }
+        report->ReplaceText(report->GetPageStarts().at(2), 0, u"x\r\nno longer full pages");
+        starts = report->GetPageStarts();
+        recovery->keep();
+        folder.crash(std::move(recovery));
+    }
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    Recovery recovery(folder.path());
+    ASSERT_EQ(recovery.leftReports().size(), 1U);
+    const UReportDoc *report = Recovery::reopen(recovery.leftReports()[0]);
+    ASSERT_NE(report, nullptr);
+    EXPECT_EQ(report->GetPageStarts(), starts);
+    EXPECT_EQ(report->GetLinesPerPage(), 7);
+    EXPECT_TRUE(report->IsPageFixed());
+    EXPECT_EQ(report->GetPages().size(), 4U);
+    auto *view = dynamic_cast<UReportView *>(report->GetViews().front());
+    EXPECT_EQ(static_cast<kareport::ReportViewWidget *>(view->GetWidget())->pageCount(), 4);
+    recovery.discardLeft();
 }
 
 TEST(Recovery, FormatsOfAnEditedRichTextComeBack)

@@ -3,7 +3,9 @@
 #include "FindBar.h"
 #include "PageBar.h"
 #include "PlainWidgets.h"
+#include "ReportChange.h"
 #include "ReportEdit.h"
+#include "ReportPages.h"
 #include "Xlate.h"
 
 #include <QHBoxLayout>
@@ -102,23 +104,63 @@ int ReportViewWidget::linesPerPage() const
     return linesPerPage_ ? std::max(1, linesPerPage_()) : usualLinesPerPage;
 }
 
+void ReportViewWidget::setPageStarts(std::function<std::vector<int>()> starts)
+{
+    pageStarts_ = std::move(starts);
+    forgetPages();
+}
+
+void ReportViewWidget::forgetPages()
+{
+    pagesOf_ = nullptr;
+    placeTimer_.start();
+}
+
+bool ReportViewWidget::isBlankLine(int line) const
+{
+    const QTextBlock block = edit_->document()->findBlockByNumber(line);
+    return block.length() <= 1 || kareport::isBlankLine(block.text());
+}
+
+const PageLines &ReportViewWidget::pages() const
+{
+    const QTextDocument *document = edit_->document();
+    const bool isCurrent =
+        pagesOf_ == document && pagesRevision_ == document->revision() && pages_.lineCount() == document->blockCount();
+    if (!isCurrent) {
+        pages_.load(pageStarts_ ? pageStarts_() : std::vector<int>(), document->blockCount(),
+                    [this](int line) { return isBlankLine(line); });
+        pagesOf_ = document;
+        pagesRevision_ = document->revision();
+    }
+    return pages_;
+}
+
+void ReportViewWidget::followEdit(const ReportChange &change, const std::vector<int> &starts)
+{
+    const QTextDocument *document = edit_->document();
+    const int added = document->blockCount() - 1 - change.lineEndsInAll + change.lineEndsRemoved;
+    if (pagesOf_ == document && pages_.lineCount() == change.lineEndsInAll + 1 && added >= 0) {
+        pages_.replace(change.lineEndsBefore, change.lineEndsRemoved, added, starts,
+                       [this](int line) { return isBlankLine(line); });
+        pagesRevision_ = document->revision();
+    }
+}
+
 int ReportViewWidget::pageCount() const
 {
-    // The line that the last line end opens does not begin a page.
-    const QTextDocument *document = edit_->document();
-    const bool isOpen = document->blockCount() > 1 && document->lastBlock().length() <= 1;
-    return (document->blockCount() - (isOpen ? 1 : 0) - 1) / linesPerPage() + 1;
+    return pages().pageCount(linesPerPage());
 }
 
 int ReportViewWidget::currentPage() const
 {
-    return std::min(pageCount(), edit_->textCursor().blockNumber() / linesPerPage() + 1);
+    return pages().pageOf(edit_->textCursor().blockNumber(), linesPerPage());
 }
 
 void ReportViewWidget::goToPage(int page)
 {
     edit_->finishLoading();
-    const int line = (std::clamp(page, 1, pageCount()) - 1) * linesPerPage();
+    const int line = pages().firstLineOf(page, linesPerPage());
     const QTextBlock block = edit_->document()->findBlockByNumber(line);
     edit_->setTextCursor(QTextCursor(block));
     edit_->verticalScrollBar()->setValue(block.firstLineNumber());

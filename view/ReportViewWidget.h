@@ -1,13 +1,16 @@
 #pragma once
 
 #include "KaReportExport.h"
+#include "PageLines.h"
 
 #include <QTimer>
 #include <QWidget>
 
 #include <functional>
+#include <vector>
 
 class QLabel;
+class QTextDocument;
 
 namespace kareport
 {
@@ -15,6 +18,7 @@ namespace kareport
 class FindBar;
 class PageBar;
 class ReportEdit;
+struct ReportChange;
 
 /// The window of a report view: the text, the bars that find a text and go to a page, and a line that says where the
 /// cursor is.
@@ -35,6 +39,12 @@ public:
 
     /// Where the lines of a page are asked for; 72 without.
     void setLinesPerPage(std::function<int()> linesPerPage);
+    /// Where the lines are asked for that pages were begun with, from 0; without, pages are cut by counting lines.
+    void setPageStarts(std::function<std::vector<int>()> starts);
+    /// What the report's pages are has changed: they are asked for again.
+    void forgetPages();
+    /// An edit has been made. @param starts  the lines that pages begin with now, among those that the edit has left
+    void followEdit(const ReportChange &change, const std::vector<int> &starts);
     /// Called when the mouse is pressed anywhere in it.
     void setPressHandler(std::function<void()> handler) { pressed_ = std::move(handler); }
     /// Called when the window comes to be seen after it was hidden.
@@ -65,6 +75,8 @@ private:
     Action actionOfKey(const QKeyEvent &event) const;
     void closeBar();
     int linesPerPage() const;
+    const PageLines &pages() const;
+    bool isBlankLine(int line) const;
     void showLoading();
     void showZoom();
 
@@ -78,6 +90,10 @@ private:
     QLabel *zoomLabel_;
     QTimer placeTimer_; ///< shows the place anew
     std::function<int()> linesPerPage_;
+    std::function<std::vector<int>()> pageStarts_;
+    mutable PageLines pages_; ///< of the text of a document at a revision
+    mutable const QTextDocument *pagesOf_ = nullptr;
+    mutable int pagesRevision_ = 0;
     std::function<void()> pressed_;
     std::function<void()> shown_;
 };

@@ -36,6 +36,7 @@ UReportView::UReportView()
     widget_ = widget;
     edit_ = &widget->edit();
     widget->setLinesPerPage([this] { return GetDocument() != nullptr ? GetDocument()->GetLinesPerPage() : 0; });
+    widget->setPageStarts([this] { return pageStartLines(); });
     widget->setPressHandler([this] { OnMouseActivate(); });
     widget->setShowHandler([this] { loadIfStale(); });
     edit_->setFocusHandler([this] { OnSetFocus(); });
@@ -59,6 +60,7 @@ UReportView::~UReportView()
         widget->setPressHandler({});
         widget->setShowHandler({});
         widget->setLinesPerPage({});
+        widget->setPageStarts({});
         widget->hide();
         widget->setParent(nullptr);
         widget->deleteLater();
@@ -126,7 +128,7 @@ void UReportView::UpdateData(bool toView)
         return;
     }
     if (!toView) {
-        report->SetData(edit_->windowText());
+        takeText();
         noteMirrored();
         report->UpdateAllViews(this, 0, nullptr);
         return;
@@ -142,6 +144,7 @@ void UReportView::UpdateData(bool toView)
         noteMirrored();
     }
     noteLoaded();
+    forgetPages();
 }
 
 void UReportView::noteLoaded()
@@ -175,6 +178,7 @@ bool UReportView::loadInPieces()
     isMirrored_ = false;
     showsFormats_ = false;
     noteLoaded();
+    forgetPages();
     // What a host appends meanwhile is shown with its next update. Any other change begins the load anew.
     const quint64 edits = report->GetEditCount();
     const auto read = [report, edits](qint64 at, qint64 count) {
@@ -242,10 +246,13 @@ void UReportView::takeEdit(const ReportChange &change)
     if (!isReplaced) {
         // Rich text, other line ends, or a text that was changed behind the view's back: the document takes over what
         // the control shows, and every further edit as the change it is.
-        report->SetData(edit_->windowText());
+        if (!carryThrough(change)) {
+            report->SetData(edit_->windowText());
+        }
         report->SetModifiedFlag(true);
     }
     noteMirrored();
+    followPages(change);
     const std::weak_ptr<UView *const> self = GetHandle();
     toldChange_ = &change;
     report->UpdateAllViews(this, 0, nullptr);
@@ -264,6 +271,7 @@ void UReportView::followEdit(const ReportChange &change)
     // is plain.
     if (!showsFormats_ && edit_->applyChange(change)) {
         noteMirrored();
+        followPages(change);
         return;
     }
     OnUpdate(nullptr, 0, nullptr);

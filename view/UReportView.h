@@ -120,6 +120,11 @@ private:
     void WrapChanged();
     bool loadInPieces();
     void noteMirrored();
+    std::vector<int> pageStartLines() const;
+    void forgetPages();
+    void followPages(const kareport::ReportChange &change);
+    bool carryThrough(const kareport::ReportChange &change);
+    void takeText();
     QRect printableRect() const; ///< twips
     void prepareRun(QPaintDevice *device);
     /// The sheets of a report whose page was given; empty where the lines flow from sheet to sheet.
@@ -145,9 +150,12 @@ private:
     quint64 mirroredEdits_ = 0; ///< the document's edits by then
     /// What other views are being told of: they take it over instead of the whole text. Null while nothing is told.
     const kareport::ReportChange *toldChange_ = nullptr;
-    bool showsFormats_ = false; ///< whether the control's text was rich text
-    QMargins m_rectMargin;      ///< twips
-    QSize m_sizePaper;          ///< twips
+    mutable std::vector<qint64> startLines_; ///< that pages begin with, of the document
+    mutable quint64 startLinesEdits_ = 0;    ///< its edits by then
+    mutable qint64 startLinesLength_ = -1;   ///< its length by then; -1 when they are not known
+    bool showsFormats_ = false;              ///< whether the control's text was rich text
+    QMargins m_rectMargin;                   ///< twips
+    QSize m_sizePaper;                       ///< twips
     std::vector<qint64> m_aPageStart;
     std::unique_ptr<kareport::PrintRun> run_; ///< of the job at hand
 };

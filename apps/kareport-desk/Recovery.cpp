@@ -25,6 +25,15 @@ namespace
 {
 
 constexpr QFileDevice::Permissions onlyUser = QFileDevice::ReadOwner | QFileDevice::WriteOwner | QFileDevice::ExeOwner;
+const QString linesPerPageKey = QStringLiteral("linesPerPage");
+const QString pageLinesKey = QStringLiteral("pages");
+
+void fixPage(UReportDoc &report, const KeptReport &kept)
+{
+    if (kept.linesPerPage > 0) {
+        report.FixPage(kept.linesPerPage, std::nullopt);
+    }
+}
 
 /// The view whose formats are not in the report's text; null when there is none.
 const UReportView *formattedView(const UReportDoc &report)
@@ -44,7 +53,10 @@ std::vector<KeptReport> readList(const RecoveryFolder &folder)
     for (const QJsonValue &entry : folder.list().value_or(QJsonArray())) {
         const QString text = entry[QStringLiteral("text")].toString();
         reports.push_back({entry[QStringLiteral("title")].toString(), entry[QStringLiteral("path")].toString(),
-                           text.isEmpty() ? text : folder.textFile(text)});
+                           text.isEmpty() ? text : folder.textFile(text), entry[linesPerPageKey].toInt()});
+        for (const QJsonValue &line : entry[pageLinesKey].toArray()) {
+            reports.back().pageLines.push_back(line.toInteger());
+        }
     }
     return reports;
 }
@@ -136,7 +148,11 @@ void Recovery::discardLeft()
 UReportDoc *Recovery::reopen(const KeptReport &kept)
 {
     if (kept.textFile.isEmpty()) {
-        return openSavedReport(kept.path);
+        UReportDoc *saved = openSavedReport(kept.path);
+        if (saved != nullptr && !saved->IsPageFixed()) {
+            fixPage(*saved, kept);
+        }
+        return saved;
     }
     QFile file(kept.textFile);
     if (!RecoveryFolder(QFileInfo(kept.textFile).path()).holdsText(kept.textFile) || !file.open(QIODevice::ReadOnly)) {
@@ -144,7 +160,12 @@ UReportDoc *Recovery::reopen(const KeptReport &kept)
     }
     UReportDoc *report = CreateReport(kept.title, true, false, nullptr, 0, nullptr);
     if (report != nullptr) {
-        report->SetData(QString::fromUtf8(file.readAll()));
+        const QString text = QString::fromUtf8(file.readAll());
+        report->SetData(text);
+        if (!kept.pageLines.empty()) {
+            report->SetPageStarts(startsOfLines(QStringView(text), kept.pageLines));
+        }
+        fixPage(*report, kept);
         if (!kept.path.isEmpty() && !isPdfName(kept.path)) {
             report->SetPathName(kept.path, false);
         }
@@ -179,6 +200,10 @@ QString Recovery::textFileOf(const UReportDoc &report)
     }
     written.edits = report.GetEditCount();
     written.length = report.GetTextLength();
+    written.pageLines = {};
+    for (const qint64 line : view != nullptr ? std::vector<qint64>() : report.GetPageStartLines()) {
+        written.pageLines.append(line);
+    }
     return written.file;
 }
 
@@ -203,8 +228,12 @@ bool Recovery::keep()
         const bool hasOwnFile = !isPdfName(report->GetPathName()); // a PDF does not bring the report back
         QJsonObject entry = {{QStringLiteral("title"), report->GetTitle()},
                              {QStringLiteral("path"), report->GetPathName()}};
+        if (report->IsPageFixed()) {
+            entry.insert(linesPerPageKey, report->GetLinesPerPage());
+        }
         if (report->IsModified() || !hasOwnFile) {
             entry.insert(QStringLiteral("text"), textFileOf(*report));
+            entry.insert(pageLinesKey, written_.value(report).pageLines);
             kept.insert(report, written_.value(report));
         }
         list.append(entry);

@@ -3,6 +3,7 @@
 #include "RecoveryFolder.h"
 
 #include <QHash>
+#include <QJsonArray>
 #include <QLockFile>
 #include <QString>
 
@@ -18,8 +19,10 @@ namespace kareport
 struct KeptReport
 {
     QString title;
-    QString path;     ///< of its file; empty for a report that has none
-    QString textFile; ///< holds what was not saved; empty when the report's own file holds all
+    QString path;                       ///< of its file; empty for a report that has none
+    QString textFile;                   ///< holds what was not saved; empty when the report's own file holds all
+    int linesPerPage = 0;               ///< of a page that was given; 0 for a measured one
+    std::vector<qint64> pageLines = {}; ///< the lines that the pages of that text begin with, from 0
 
     /// What the user knows it by: a report that was opened from a file has no title.
     QString name() const;
@@ -62,6 +65,7 @@ private:
         QString file;
         quint64 edits = 0;
         qint64 length = -1;
+        QJsonArray pageLines;
     };
 
     QString textFileOf(const UReportDoc &report);

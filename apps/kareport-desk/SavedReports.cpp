@@ -2,6 +2,7 @@
 
 #include "FileBytes.h"
 #include "PdfFile.h"
+#include "ReportContent.h"
 #include "ReportEntry.h"
 #include "ReportTextDecoder.h"
 #include "RichTextReader.h"
@@ -43,13 +44,30 @@ Expected<std::optional<QString>> exactText(const QString &path)
     return isOther ? std::nullopt : std::optional(std::move(text));
 }
 
+/// Its pages are those that it was written in, whatever a page would be measured to now.
+void keepPageLength(UReportDoc &report, QStringView text)
+{
+    if (const auto lines = linesOfPages(text)) {
+        report.FixPage(lines, std::nullopt);
+    }
+}
+
+/// The same of a report that was loaded byte by byte, or as rich text: what counts is what it shows.
+UReportDoc *withPageLength(UReportDoc *report)
+{
+    if (report != nullptr) {
+        keepPageLength(*report, shownPlainText(*report));
+    }
+    return report;
+}
+
 void fill(UReportDoc &report, const QString &text)
 {
     report.Clear();
-    // Its pages are those that it was written in, whatever a page would be measured to now.
-    report.FixPage(linesOfPages(text), std::nullopt);
+    keepPageLength(report, text);
     report.SetPageSize();
     writeLines(report, text);
+    report.FindPageStarts();
     report.UpdateAllViews(nullptr, 0, nullptr);
     report.SetModifiedFlag(false);
 }
@@ -79,7 +97,8 @@ UReportDoc *openSavedReport(const QString &path)
     }
     const auto &text = std::get<std::optional<QString>>(read);
     if (!text) {
-        return dynamic_cast<UReportDoc *>(GetReportTemplate()->OpenReportDocumentFile(path, 1, 1, nullptr, 0, nullptr));
+        return withPageLength(
+            dynamic_cast<UReportDoc *>(GetReportTemplate()->OpenReportDocumentFile(path, 1, 1, nullptr, 0, nullptr)));
     }
     UReportDoc *report = CreateReport(QString(), true, false, nullptr, 0, nullptr);
     if (report != nullptr) {
@@ -105,6 +124,7 @@ bool reloadSavedReport(UReportDoc &report)
     }
     report.Clear();
     const bool isLoaded = report.OnOpenDocument(report.GetPathName());
+    withPageLength(&report);
     report.UpdateAllViews(nullptr, 0, nullptr);
     return isLoaded;
 }

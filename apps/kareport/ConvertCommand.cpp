@@ -144,6 +144,7 @@ ExitStatus ConvertCommand::run(int &argc, char **argv) const
     if (report.HasLostText()) {
         throw std::bad_alloc();
     }
+    report.FindPageStarts();
     // The report holds it all now.
     file = InputError();
     saved.text = QString();

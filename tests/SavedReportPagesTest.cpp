@@ -1,0 +1,77 @@
+#include "DeskFixture.h"
+
+#include "PageHeader.h"
+#include "ReportEdit.h"
+#include "ReportViewWidget.h"
+#include "SavedReports.h"
+#include "UReportView.h"
+
+#include <QTextBlock>
+
+#include <gtest/gtest.h>
+
+namespace
+{
+
+QString header(int page)
+{
+    return kareport::pageHeaderLine(QStringLiteral("TALVEN"), QStringLiteral("T"),
+                                    QDateTime(QDate(2024, 3, 5), QTime(14, 7)), QStringLiteral("   Page:"), 80) +
+           QString::number(page).rightJustified(3);
+}
+
+/// Three pages of seven lines; a line was put into the second one since.
+QStringList savedLines()
+{
+    QStringList lines;
+    for (int page = 1; page <= 3; ++page) {
+        lines += {header(page), QString(), QString(), QString(), QStringLiteral("a"), QStringLiteral("b")};
+        lines += page == 2 ? QStringList{QStringLiteral("c"), QString()} : QStringList{QString()};
+    }
+    return lines;
+}
+
+TEST(SavedReportPages, AReopenedReportHasThePagesThatItWasWrittenIn)
+{
+    const JobFolder files;
+    files.put("a.rep", "\xEF\xBB\xBF" + savedLines().join(QStringLiteral("\r\r\n")).toUtf8());
+    files.put("cr.rep", savedLines().join(QStringLiteral("\r\r\n")).toUtf8()); // a text with returns in it
+    files.put("a.rtf", ("{\\rtf1\\ansi{\\fonttbl{\\f0 Courier;}}\\f0 " + savedLines().join(QStringLiteral("\\par\n")) +
+                        QStringLiteral("\\par}"))
+                           .toLatin1());
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    for (const char *name : {"a.rep", "cr.rep", "a.rtf"}) {
+        UReportDoc *report = kareport::openSavedReport(files.path(name));
+        ASSERT_NE(report, nullptr) << name;
+        for (int turn = 0; turn < 2; ++turn) {
+            EXPECT_EQ(report->GetPages().size(), 3U) << name << ", turn " << turn;
+            EXPECT_EQ(report->GetLinesPerPage(), 7) << name << ": what most pages have";
+            EXPECT_TRUE(report->IsPageFixed()) << name;
+            auto *view = dynamic_cast<UReportView *>(report->GetViews().front());
+            ASSERT_NE(view, nullptr);
+            auto *widget = static_cast<kareport::ReportViewWidget *>(view->GetWidget());
+            EXPECT_EQ(widget->pageCount(), 3) << name;
+            widget->goToPage(3);
+            EXPECT_EQ(widget->edit().textCursor().block().text(), header(3)) << name;
+            ASSERT_TRUE(kareport::reloadSavedReport(*report)) << name;
+        }
+    }
+}
+
+TEST(SavedReportPages, AReloadedReportKeepsAPageLengthThatItsTextDoesNotTell)
+{
+    const JobFolder files;
+    files.put("a.rep", "one\r\r\ntwo\r\r\nthree\r\r\n");
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    UReportDoc *report = kareport::openSavedReport(files.path("a.rep"));
+    ASSERT_NE(report, nullptr);
+    EXPECT_FALSE(report->IsPageFixed()) << "as measured";
+    report->FixPage(2, 80);
+    ASSERT_TRUE(kareport::reloadSavedReport(*report));
+    EXPECT_EQ(report->GetLinesPerPage(), 2);
+    EXPECT_EQ(report->GetPages().size(), 2U);
+}
+
+} // namespace
