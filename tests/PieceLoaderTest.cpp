@@ -44,7 +44,7 @@ TEST(PieceLoader, GivesTheTextThatIsLoadedAtOnce)
         for (qint64 most = 2; most <= 9; ++most) {
             QTextDocument document;
             document.setUndoRedoEnabled(false);
-            PieceLoader loader(document, inPiecesOf(QString::fromUtf16(row.text), most), [](bool) {});
+            PieceLoader loader(document, inPiecesOf(QString::fromUtf16(row.text), most), [] {});
             loader.finish();
             EXPECT_EQ(document.toRawText(), expected.toRawText()) << row.reason << ", pieces of " << most;
             EXPECT_TRUE(loader.isDone());
@@ -53,20 +53,22 @@ TEST(PieceLoader, GivesTheTextThatIsLoadedAtOnce)
     }
 }
 
-TEST(PieceLoader, LoadsFromTheEventLoopAndTellsOfTheLastPieceOnce)
+TEST(PieceLoader, LoadsFromTheEventLoopAsLongAsAPieceIsMissing)
 {
     const QString text = QStringLiteral("a line of the report\r\n").repeated(500);
     QTextDocument document;
     int pieces = 0;
-    int last = 0;
-    PieceLoader loader(document, inPiecesOf(text, 1000), [&](bool isWhole) {
+    std::unique_ptr<PieceLoader> loader;
+    loader = std::make_unique<PieceLoader>(document, inPiecesOf(text, 1000), [&] {
         ++pieces;
-        last += isWhole ? 1 : 0;
+        loader->addPiece();
     });
     EXPECT_EQ(document.characterCount(), 1) << "nothing is loaded before the loop runs";
-    ASSERT_TRUE(QTest::qWaitFor([&] { return last > 0; }, 5000));
+    ASSERT_TRUE(QTest::qWaitFor([&] { return loader->isDone(); }, 5000));
+    const int all = pieces;
     QCoreApplication::processEvents();
-    EXPECT_EQ(last, 1);
+    EXPECT_EQ(pieces, all) << "nothing is due any more";
+    EXPECT_FALSE(loader->isCutShort());
     EXPECT_GE(pieces, 11) << "a piece holds at most 1000 characters of 11000";
     EXPECT_EQ(document.blockCount(), 501);
 }
@@ -75,9 +77,10 @@ TEST(PieceLoader, EndsWhereTheTextEndsThatHasBecomeShorter)
 {
     QTextDocument document;
     PieceLoader loader(document, {100, [](qint64 at, qint64) { return at == 0 ? QStringLiteral("abc\n") : QString(); }},
-                       [](bool) {});
+                       [] {});
     loader.finish();
     EXPECT_EQ(document.toPlainText(), QStringLiteral("abc\n"));
+    EXPECT_TRUE(loader.isCutShort());
 }
 
 } // namespace

@@ -159,6 +159,40 @@ TEST(UReportViewLoad, ChangedBehindItsBackShowsTheChange)
     EXPECT_TRUE(report.edit().windowText().endsWith(QStringLiteral("last words")));
 }
 
+TEST(UReportViewLoad, ThatIsFinishedAfterASilentChangeHandsNoPartOfTheTextOn)
+{
+    struct Row
+    {
+        void (*act)(UReportView &view);
+        const char *reason;
+    };
+    const Row rows[] = {
+        {[](UReportView &view) { view.UpdateData(false); }, "loading into the document"},
+        {[](UReportView &view) { view.OnChange(); }, "taking over the text"},
+        {[](UReportView &view) { widgetOf(view).openPageBar(); }, "asking for a page"},
+        {[](UReportView &view) { QTest::keyClick(&view.GetEdit(), Qt::Key_End, Qt::ControlModifier); },
+         "going to the end"},
+    };
+    for (const Row &row : rows) {
+        LongReport report;
+        report.shown.report.ReplaceText(0, 4, u"LINE"); // by a host that tells nobody
+        row.act(*report.view);
+        EXPECT_FALSE(report.edit().isLoading()) << row.reason;
+        EXPECT_EQ(report.shown.report.GetTextLength(), longText().size()) << row.reason;
+        EXPECT_EQ(report.edit().windowText(), report.shown.report.CopyText()) << row.reason;
+    }
+}
+
+TEST(UReportViewLoad, KeepsTheUsersCursorAndSelectionWhereTheyAre)
+{
+    LongReport report;
+    const int end = report.edit().document()->characterCount() - 1;
+    putCursor(report.edit(), end, end - 10);
+    ASSERT_TRUE(waitUntil([&] { return !report.edit().isLoading(); }));
+    EXPECT_EQ(report.edit().textCursor().position(), end);
+    EXPECT_EQ(report.edit().textCursor().anchor(), end - 10);
+}
+
 TEST(UReportViewLoad, KeepsThePlaceWhereTheWindowStood)
 {
     LongReport report;

@@ -29,13 +29,12 @@ qsizetype wholeLines(QStringView piece)
 
 } // namespace
 
-PieceLoader::PieceLoader(QTextDocument &document, PiecedText text, std::function<void(bool)> added)
-    : document_(document), text_(std::move(text)), added_(std::move(added)), pieceLength_(firstPiece)
+PieceLoader::PieceLoader(QTextDocument &document, PiecedText text, std::function<void()> due)
+    : document_(document), text_(std::move(text)), due_(std::move(due)), pieceLength_(firstPiece)
 {
     QObject::connect(&timer_, &QTimer::timeout, &timer_, [this] {
-        addPiece();
-        const auto handler = added_; // which may take the loader away
-        handler(isDone());
+        const auto handler = due_; // which may take the loader away
+        handler();
     });
     timer_.start(0);
 }
@@ -49,7 +48,8 @@ QString PieceLoader::nextPiece()
 {
     QString piece = text_.read(at_, std::min(pieceLength_, text_.length - at_));
     if (piece.isEmpty()) {
-        at_ = text_.length; // there is no more of it
+        isCutShort_ = at_ < text_.length;
+        at_ = text_.length;
         return piece;
     }
     if (at_ + piece.size() < text_.length) {

@@ -25,14 +25,16 @@ class KAREPORT_EXPORT PieceLoader
 {
 public:
     /// @param document  empty, without undo steps; must live as long as the loader
-    /// @param added     called after each piece that was added from the event loop, with whether it was the last
-    PieceLoader(QTextDocument &document, PiecedText text, std::function<void(bool isWhole)> added);
+    /// @param due       called from the event loop until all is loaded: the next piece may be added now
+    PieceLoader(QTextDocument &document, PiecedText text, std::function<void()> due);
 
     bool isDone() const { return at_ >= text_.length; }
+    /// Whether the text has ended before its length.
+    bool isCutShort() const { return isCutShort_; }
     int percent() const;
     /// Adds the next piece.
     void addPiece();
-    /// Adds all that is missing, without calling `added`.
+    /// Adds all that is missing.
     void finish();
 
 private:
@@ -40,8 +42,9 @@ private:
 
     QTextDocument &document_;
     PiecedText text_;
-    std::function<void(bool)> added_;
+    std::function<void()> due_;
     qint64 at_ = 0;
+    bool isCutShort_ = false;
     qint64 pieceLength_;
     QTimer timer_;
 };

@@ -88,19 +88,13 @@ void ReportEdit::loadPlainText(const QString &text)
     take(loaded);
 }
 
-void ReportEdit::loadPlainTextInPieces(PiecedText text, std::function<void()> loaded)
+void ReportEdit::loadPlainTextInPieces(PiecedText text, std::function<void(bool isWhole)> loaded)
 {
     setPalette(QPalette());
     const Place before = isWaiting() ? wanted_ : place();
     QTextDocument *filled = newDocument(this, font());
     filled->setUndoRedoEnabled(false);
-    auto loader = std::make_unique<PieceLoader>(*filled, std::move(text), [this](bool isWhole) {
-        if (isWhole) {
-            endLoading();
-        } else if (loading_) {
-            loading_();
-        }
-    });
+    auto loader = std::make_unique<PieceLoader>(*filled, std::move(text), [this] { loadPiece(); });
     loader->addPiece(); // before the control's cursor stands in the document, at whose end the pieces come in
     take(filled);
     document()->setUndoRedoEnabled(false);
@@ -113,6 +107,25 @@ void ReportEdit::loadPlainTextInPieces(PiecedText text, std::function<void()> lo
     waiting_ = textCursor().position();
     isScrolled_ = false;
     setReadOnly(true);
+    if (loader_->isDone()) {
+        endLoading();
+    } else if (loading_) {
+        loading_();
+    }
+}
+
+void ReportEdit::loadPiece()
+{
+    // A cursor at the end of what has been loaded would go along with what is added there.
+    const int position = textCursor().position();
+    const int anchor = textCursor().anchor();
+    loader_->addPiece();
+    if (textCursor().position() != position || textCursor().anchor() != anchor) {
+        QTextCursor cursor(document());
+        cursor.setPosition(anchor);
+        cursor.setPosition(position, QTextCursor::KeepAnchor);
+        setTextCursor(cursor);
+    }
     if (loader_->isDone()) {
         endLoading();
     } else if (loading_) {
@@ -140,6 +153,7 @@ void ReportEdit::stopLoading()
 void ReportEdit::endLoading()
 {
     const bool wasWaiting = isWaiting();
+    const bool isWhole = !loader_->isCutShort();
     loader_.reset();
     setReadOnly(false);
     document()->setUndoRedoEnabled(true);
@@ -151,7 +165,7 @@ void ReportEdit::endLoading()
         loading_();
     }
     if (const auto loaded = std::exchange(loaded_, {})) {
-        loaded();
+        loaded(isWhole);
     }
 }
 

@@ -35,8 +35,9 @@ public:
     void loadPlainText(const QString &text);
     /// The same in pieces: its beginning at once, the rest from the event loop. Until all of it is there nothing can be
     /// edited, and a place beyond what has been loaded is kept for the end.
-    /// @param loaded  called when all of it is there; not when another text is loaded first
-    void loadPlainTextInPieces(PiecedText text, std::function<void()> loaded);
+    /// @param loaded  called when all of it is there, or as much as the text still had; not when another text is loaded
+    ///                first. It may load the text again
+    void loadPlainTextInPieces(PiecedText text, std::function<void(bool isWhole)> loaded);
     bool isLoading() const { return loader_ != nullptr; }
     /// How much of the text has been loaded.
     int loadedPercent() const { return loader_ ? loader_->percent() : 100; }
@@ -99,6 +100,7 @@ private:
     bool isWaiting() const;
     void goTo(const Place &place);
     void take(QTextDocument *loaded);
+    void loadPiece();
     void endLoading();
     void watch();
     void noteEdit(int position, int removed, int added);
@@ -111,10 +113,10 @@ private:
     std::function<void()> loading_;
     QMetaObject::Connection watching_;
     std::unique_ptr<PieceLoader> loader_;
-    std::function<void()> loaded_; ///< called when `loader_` has done
-    Place wanted_ = {};            ///< where the window stood before, which may not have been loaded yet
-    int waiting_ = 0;              ///< the cursor's position until then
-    bool isScrolled_ = false;      ///< by the user, since loading began
+    std::function<void(bool)> loaded_; ///< called when `loader_` has done
+    Place wanted_ = {};                ///< where the window stood before, which may not have been loaded yet
+    int waiting_ = 0;                  ///< the cursor's position until then
+    bool isScrolled_ = false;          ///< by the user, since loading began
     bool isFollowing_ = false;
     int length_ = 0;
     int lineEnds_ = 0;

@@ -185,9 +185,13 @@ bool UReportView::loadInPieces()
         const bool isSame = UReportDoc::IsReportAvailable(report) && report->GetEditCount() == edits;
         return isSame ? report->CopyText(at, count) : QString();
     };
-    edit_->loadPlainTextInPieces({report->GetTextLength(), read}, [this, edits, length = report->GetTextLength()] {
-        if (GetDocument() != nullptr && GetDocument()->GetEditCount() != edits) {
-            OnUpdate(nullptr, 0, nullptr);
+    const qint64 length = report->GetTextLength();
+    edit_->loadPlainTextInPieces({length, read}, [this, edits, length](bool isWhole) {
+        if (GetDocument() == nullptr) {
+            return;
+        }
+        if (!isWhole || GetDocument()->GetEditCount() != edits) {
+            UpdateData(true); // whoever waits for the whole text must not be handed a part of it
         } else {
             noteMirrored();
             loadedLength_ = length;
