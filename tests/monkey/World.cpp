@@ -155,19 +155,9 @@ QString World::textOf(const UReportDoc &report)
     return report.CopyText();
 }
 
-template <typename Report>
-static qsizetype pagesTMP(const Report &report)
-{
-    if constexpr (requires { report.GetPages(); }) {
-        return static_cast<qsizetype>(report.GetPages().size());
-    } else {
-        return 0;
-    }
-}
-
 qsizetype World::pagesOf(const UReportDoc &report)
 {
-    return pagesTMP(report);
+    return static_cast<qsizetype>(report.GetPages().size());
 }
 
 std::vector<UReportView *> World::viewsOnScreen()
