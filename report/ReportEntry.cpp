@@ -20,18 +20,6 @@ kareport::ReportViewPort::~ReportViewPort() = default;
 
 void LoadKaReport() {}
 
-void kareport::noteExitCancelled()
-{
-    if (UApplication::Get() == nullptr) {
-        return;
-    }
-    for (UDocument *document : UApplication::Get()->GetDocuments()) {
-        if (auto *report = dynamic_cast<UReportDoc *>(document)) {
-            report->SetCloseDocument(0);
-        }
-    }
-}
-
 std::unique_ptr<UDocTemplate> kareport::makeReportTemplate(UDocTemplate::PaneFactory makePane,
                                                            UDocTemplate::ViewFactory makeView)
 {

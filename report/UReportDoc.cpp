@@ -6,6 +6,7 @@
 #include "PageHeader.h"
 #include "Preferences.h"
 #include "Profile.h"
+#include "ReportExit.h"
 #include "ReportMargins.h"
 #include "ReportWindow.h"
 #include "TemplateText.h"
@@ -60,6 +61,7 @@ UReportDoc::UReportDoc(const QString &name, bool externalEditor, bool closeDocum
 UReportDoc::~UReportDoc()
 {
     UReportMgr.erase(this);
+    kareport::forgetExit(*this);
     delete std::exchange(reportWindow_, nullptr);
 }
 

@@ -2,6 +2,7 @@
 
 #include "CViewPane.h"
 #include "MemoryLasts.h"
+#include "ReportExit.h"
 #include "ReportViews.h"
 #include "ReportWindow.h"
 #include "TemplateText.h"
@@ -112,7 +113,9 @@ void UReportDoc::CloseReportDocument()
 {
     const bool deferred = closeMode_ == 1;
     closeMode_ = 2;
-    if (!deferred) {
+    if (deferred) {
+        kareport::noteCloseAsked(*this);
+    } else {
         OnCloseDocument();
     }
 }

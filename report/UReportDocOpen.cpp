@@ -88,11 +88,10 @@ int UReportDoc::LoadFile(const QString &path, bool keepLineEnds)
     if (!kareport::whileMemoryLasts(false, [&] { return file.emplace(path).open(QIODevice::ReadOnly); })) {
         return 0;
     }
-    page_.losesNothing([&] { readLines(*file, namesRichText(path), keepLineEnds); });
+    const bool isWhole = page_.losesNothing([&] { readLines(*file, namesRichText(path), keepLineEnds); });
     file.reset();
-    const bool hasLostText = HasLostText();
     UpdateAllViews(nullptr, 0, nullptr); // may hand the report to an editor and close it
-    return hasLostText ? 0 : 1;
+    return isWhole ? 1 : 0;
 }
 
 void UReportDoc::readLines(QIODevice &file, bool mayBeRichText, bool keepLineEnds)

@@ -80,6 +80,11 @@ TEST(ActivePaneDesk, ACancelledExitLeavesEveryReportAsItWas)
             settle();
             EXPECT_TRUE(desk.frame->isVisible());
             EXPECT_EQ(asked, cancelledAt);
+            if (!byView) {
+                reports[1]->OnCloseDocument();
+                ASSERT_TRUE(UReportDoc::IsReportAvailable(reports[1])) << "deferred by its host, not by the exit";
+                reports[1]->SetCloseDocument(0);
+            }
             for (UReportDoc *report : reports) {
                 ASSERT_TRUE(UReportDoc::IsReportAvailable(report));
                 report->OnCloseDocument();

@@ -139,8 +139,7 @@ TEST_F(ActivePane, ViewsAreToldThatTheyWereActivated)
 
     view->told.clear();
     view->OnMouseActivate();
-    ASSERT_FALSE(view->told.empty());
-    EXPECT_EQ(view->told.back(), (ToldView::Told{true, view, third})) << "pressed in, by the view itself";
+    EXPECT_EQ(view->told, (std::vector<ToldView::Told>{{true, view, third}})) << "pressed in, by the view itself";
     desk.frame->setFocus();
     view->told.clear();
     view->OnMouseActivate();
@@ -150,6 +149,79 @@ TEST_F(ActivePane, ViewsAreToldThatTheyWereActivated)
     view->told.clear();
     view->OnMouseActivate();
     EXPECT_TRUE(view->told.empty()) << "it has both";
+}
+
+TEST_F(ActivePane, EachChangeTellsBothViewsOnce)
+{
+    UApplication told;
+    told.AddDocTemplate(
+        kareport::makeReportTemplate([] { return new CReportViewPane; }, [] { return std::make_unique<ToldView>(); }));
+    const UReportDoc *first = desk.openReport(QStringLiteral("Told first"));
+    const UReportDoc *second = desk.openReport(QStringLiteral("Told second"));
+    auto *one = dynamic_cast<ToldView *>(first->GetViews().front());
+    auto *two = dynamic_cast<ToldView *>(second->GetViews().front());
+    const std::function<void(ToldView *)> ways[] = {
+        [this](ToldView *view) { desk.frame->SetActiveViewForFrameAndPane(view); },
+        [](ToldView *view) { view->OnMouseActivate(); },
+        [this](ToldView *view) { clickTab(*desk.frame, dynamic_cast<COneViewPane &>(*view->GetParentPane())); },
+    };
+    for (const auto &activate : ways) {
+        for (int turn = 0; turn < 2; ++turn) {
+            ToldView *next = desk.frame->GetActiveView() == one ? two : one;
+            ToldView *before = next == one ? two : one;
+            one->told.clear();
+            two->told.clear();
+            activate(next);
+            WindowDesk::settle();
+            EXPECT_EQ(before->told, (std::vector<ToldView::Told>{{false, next, before}})) << &activate - ways;
+            EXPECT_EQ(next->told, (std::vector<ToldView::Told>{{true, next, before}})) << &activate - ways;
+            EXPECT_EQ(wrongWithActive(*desk.frame), QString());
+        }
+    }
+}
+
+TEST_F(ActivePane, AViewThatGoesWhenItIsNoLongerTheActiveOneIsNotPassedOn)
+{
+    class LeavingView : public ToldView
+    {
+    public:
+        void OnActivateView(bool activate, UView *activated, UView *deactivated) override
+        {
+            ToldView::OnActivateView(activate, activated, deactivated);
+            if (!activate && leaves) {
+                GetDocument()->OnCloseDocument();
+            }
+        }
+        bool leaves = false;
+    };
+    UApplication told;
+    told.AddDocTemplate(kareport::makeReportTemplate([] { return new CReportViewPane; },
+                                                     [] { return std::make_unique<LeavingView>(); }));
+    const UReportDoc *stays = desk.openReport(QStringLiteral("Stays"));
+    const UReportDoc *leaves = desk.openReport(QStringLiteral("Leaves"));
+    auto *next = dynamic_cast<LeavingView *>(stays->GetViews().front());
+    dynamic_cast<LeavingView *>(leaves->GetViews().front())->leaves = true;
+    next->told.clear();
+    ASSERT_TRUE(clickTab(*desk.frame, dockPaneOf(*stays)));
+    WindowDesk::settle();
+    EXPECT_FALSE(UReportDoc::IsReportAvailable(leaves));
+    EXPECT_EQ(next->told, (std::vector<ToldView::Told>{{true, next, nullptr}}));
+    EXPECT_EQ(wrongWithActive(*desk.frame), QString());
+}
+
+TEST_F(ActivePane, AViewThatNobodySeesLeavesTheKeyboardItsCommands)
+{
+    UView *hidden = reports[0]->GetViews().front();
+    pane(0).ShowPane(false);
+    WindowDesk::settle();
+    ASSERT_EQ(wrongWithActive(*desk.frame), QString());
+    const COneViewPane *shown = desk.frame->GetActivePane();
+    desk.frame->SetActiveViewForFrameAndPane(hidden); // as a host may do
+    WindowDesk::settle();
+    EXPECT_EQ(desk.frame->GetActivePane(), shown);
+    EXPECT_EQ(wrongWithActive(*desk.frame), QString());
+    QGuiApplication::clipboard()->setText(QStringLiteral("pasted"));
+    EXPECT_TRUE(desk.frame->OnCommand(57637));
 }
 
 TEST_F(ActivePane, NoCommandReachesAViewThatNobodySees)
@@ -198,13 +270,23 @@ TEST_F(ActivePane, AHiddenPaneDoesNotKeepAReport)
     EXPECT_EQ(dockPaneOf(*report, 1).GetWindowNumber(), 2);
 }
 
+class RefusingFrame : public UXTPMDIFrameWnd
+{
+public:
+    std::function<void()> meanwhile;
+
+protected:
+    void closeEvent(QCloseEvent *event) override
+    {
+        event->ignore();
+        if (meanwhile) {
+            meanwhile();
+        }
+    }
+};
+
 TEST_F(ActivePane, AnExitThatIsRefusedClosesNoReportLater)
 {
-    class RefusingFrame : public UXTPMDIFrameWnd
-    {
-    protected:
-        void closeEvent(QCloseEvent *event) override { event->ignore(); }
-    };
     desk.frame.reset();
     RefusingFrame frame;
     frame.show();
@@ -216,7 +298,39 @@ TEST_F(ActivePane, AnExitThatIsRefusedClosesNoReportLater)
     report->OnCloseDocument();
     EXPECT_FALSE(UReportDoc::IsReportAvailable(report));
     other->OnCloseDocument();
-    EXPECT_FALSE(UReportDoc::IsReportAvailable(other)) << "all of them close as before";
+    ASSERT_TRUE(UReportDoc::IsReportAvailable(other)) << "the host itself has deferred it";
+    kareport::noteExitCancelled();
+    other->CloseReportDocument();
+    ASSERT_TRUE(UReportDoc::IsReportAvailable(other)) << "only asked for";
+    kareport::noteExitCancelled();
+    ASSERT_TRUE(UReportDoc::IsReportAvailable(other)) << "by the host, that closes it when it likes";
+    other->CloseReportDocument();
+    EXPECT_FALSE(UReportDoc::IsReportAvailable(other));
+    desk.application.reset();
+}
+
+TEST_F(ActivePane, AReportThatIsAskedToCloseDuringAnExitThatIsRefusedIsClosedThen)
+{
+    desk.frame.reset();
+    RefusingFrame frame;
+    frame.show();
+    UReportDoc *report = CreateReportWindow(QStringLiteral("Written"), false, false);
+    report->Activate(true);
+    frame.meanwhile = [report] {
+        report->CloseReportDocument();
+        EXPECT_TRUE(UReportDoc::IsReportAvailable(report)) << "not before the exit is decided";
+    };
+    dynamic_cast<UReportView *>(report->GetViews().front())->OnReportExit();
+    EXPECT_FALSE(UReportDoc::IsReportAvailable(report));
+
+    UReportDoc *gone = CreateReportWindow(QStringLiteral("Gone"), false, false);
+    gone->Activate(true);
+    frame.meanwhile = [gone] {
+        gone->CloseReportDocument();
+        gone->CloseReportDocument();
+        EXPECT_FALSE(UReportDoc::IsReportAvailable(gone)) << "the second call closes";
+    };
+    dynamic_cast<UReportView *>(gone->GetViews().front())->OnReportExit();
     desk.application.reset();
 }
 

@@ -4,7 +4,9 @@
 #include "CommandLine.h"
 #include "DeskCommandIds.h"
 #include "DeskPreferences.h"
+#include "FrameFixture.h"
 #include "ReportEdit.h"
+#include "SaveDialog.h"
 #include "SavedReports.h"
 #include "UApplication.h"
 #include "UReportList.h"
@@ -470,6 +472,77 @@ TEST(DeskFrame, ItsOwnSavesAreNoChangesOfOthers)
     EXPECT_TRUE(QTest::qWaitFor([&desk] { return !desk.messages.isEmpty(); }));
     EXPECT_EQ(desk.messages.size(), 1);
     EXPECT_TRUE(desk.messages.value(0).contains(QStringLiteral("other.rep")));
+}
+
+/// The view of a report that the user sees.
+UReportView *visibleView(const UReportDoc &report)
+{
+    for (UView *view : report.GetViews()) {
+        if (view->IsVisible()) {
+            return dynamic_cast<UReportView *>(view);
+        }
+    }
+    return nullptr;
+}
+
+TEST(DeskFrame, AReportOfAJobWithARichTextImageIsEditedSavedAndLoadedAgainAsAnyOther)
+{
+    const JobFolder folder;
+    folder.put("a.json", R"({"title": "Lines", "header": false, "page": {"linesPerPage": 60, "charsPerRow": 80},
+                             "report": [{"line": "First line"}],
+                             "output": [{"file": "word.rtf", "as": "rtf-image"}]})");
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.json")));
+    UReportDoc *report = Desk::reports().front();
+    EXPECT_FALSE(report->GetRTFDataFlag()) << "the view shows the text";
+    dynamic_cast<UReportWindowDlg *>(report->GetReportWindow())->ShowReport();
+    QCoreApplication::processEvents();
+    ASSERT_NE(visibleView(*report), nullptr);
+    QTest::keyClick(&visibleView(*report)->GetEdit(), Qt::Key_X);
+    setSaveDialog([&folder](const SaveRequest &) { return folder.path("x.rtf"); });
+    EXPECT_TRUE(report->DoSave(QString(), true));
+    setSaveDialog({});
+    EXPECT_NE(contentOf(folder.path("x.rtf")).find("xFirst line"), std::string::npos) << "what was typed is saved";
+    EXPECT_EQ(Desk::textOf(*report), QStringLiteral("xFirst line\n")) << "and stays";
+    for (const bool isOn : {false, true}) {
+        report->SetRTFDataFlag(isOn);
+        folder.put("x.rtf", "{\\rtf1 new}");
+        ASSERT_TRUE(reloadSavedReport(*report));
+        EXPECT_EQ(Desk::textOf(*report), QStringLiteral("{\\rtf1 new}\n")) << "whatever the mode was: " << isOn;
+    }
+}
+
+TEST(DeskFrame, WhatIsTypedAfterAReportWasGivenUpIsNotThrownAway)
+{
+    struct Row
+    {
+        bool isTyped;
+        const char *reason;
+    };
+    for (const Row &row :
+         {Row{false, "not to be saved, and nobody can see it"}, Row{true, "the answer was about what there was then"}})
+    {
+        Desk desk;
+        desk.answer = MessageAnswer::No;
+        const JobFolder folder;
+        folder.put("a.json", lineJob());
+        ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.json")));
+        UReportDoc *report = Desk::reports().front();
+        ASSERT_TRUE(desk.frame->OnCommand(windowNewCommand));
+        dynamic_cast<UReportWindowDlg *>(report->GetReportWindow())->OnPressCloseButton();
+        QCoreApplication::processEvents();
+        ASSERT_TRUE(UReportDoc::IsReportAvailable(report)) << "its second pane shows it";
+        UReportView *view = visibleView(*report);
+        ASSERT_NE(view, nullptr);
+        if (row.isTyped) {
+            QTest::keyClick(&view->GetEdit(), Qt::Key_X);
+        }
+        view->GetParentPane()->ShowPane(false);
+        EXPECT_TRUE(QTest::qWaitFor([report] { return !UReportDoc::IsReportAvailable(report) || report->IsShown(); }))
+            << row.reason;
+        EXPECT_EQ(UReportDoc::IsReportAvailable(report), row.isTyped) << row.reason;
+    }
 }
 
 } // namespace

@@ -1,6 +1,7 @@
 #include "DeskFixture.h"
 
 #include "DeskPreferences.h"
+#include "EditorHold.h"
 #include "EditorLauncher.h"
 
 #include <gtest/gtest.h>
@@ -103,6 +104,23 @@ TEST(EditorHold, AProgramThatCannotBeStartedHoldsNothing)
     UReportDoc *report = CreateReport(QStringLiteral("R"), false, false, nullptr, 0, nullptr);
     kareport::launchEditor(QStringLiteral("/no/such/program"), QStringLiteral("/tmp/x.rep"), QString(), report);
     EXPECT_TRUE(report->EnableCloseOption());
+}
+
+TEST(EditorHold, AReportThatComesInThePlaceOfAClosedOneIsNotHeld)
+{
+    const WaitingEditor editor;
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    preferEditor(editor.path(), true);
+    UReportDoc *report = CreateReport(QStringLiteral("R"), false, false, nullptr, 0, nullptr);
+    report->SetModifiedFlag(false);
+    kareport::EditorHold hold;
+    kareport::launchEditor(editor.path(), QStringLiteral("/tmp/x.rep"), QString(), report);
+    EXPECT_TRUE(QTest::qWaitFor([&editor] { return editor.hasStarted(); }));
+    EXPECT_TRUE(hold.holds(*report));
+    hold.forget(report); // what has its address from now on is another one
+    EXPECT_FALSE(hold.holds(*report));
+    report->EnableCloseOption(true);
 }
 
 } // namespace

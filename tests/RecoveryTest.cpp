@@ -461,4 +461,34 @@ TEST(Recovery, ALinkInItsOwnFolderIsReplacedAndNotWrittenThrough)
     foreign.expectWhole("ended");
 }
 
+TEST(Recovery, ATextThatCouldNotBeOpenedAgainStaysOnTheDisk)
+{
+    struct Row
+    {
+        const char *list;
+        bool isLost;
+        bool isKept;
+        const char *reason;
+    };
+    for (const Row &row :
+         {Row{R"([{"title": "T", "text": "1"}])", false, false, "it is open again"},
+          Row{R"([{"title": "T", "text": "1"}])", true, true, "it is nowhere else"},
+          Row{R"([{"title": "T", "text": "2"}])", true, false, "there is no such text, and nothing to keep"},
+          Row{R"([{"title": "T", "path": "/no/such/file"}])", true, false, "it had no text of its own"}})
+    {
+        const CrashFolder folder;
+        const QString program = folder.path() + u'/' + programName + u'8';
+        QDir().mkpath(program);
+        putFile(program + QStringLiteral("/reports.json"), row.list);
+        putFile(program + QStringLiteral("/1"), "text");
+        {
+            Recovery recovery(folder.path());
+            ASSERT_EQ(recovery.leftReports().size(), 1U) << row.reason;
+            recovery.discardLeft(row.isLost ? recovery.leftReports() : std::vector<KeptReport>());
+        }
+        EXPECT_EQ(QFile::exists(program + QStringLiteral("/1")), row.isKept) << row.reason;
+        EXPECT_EQ(Recovery(folder.path()).leftReports().size(), row.isKept ? 1U : 0U) << row.reason;
+    }
+}
+
 } // namespace

@@ -74,4 +74,18 @@ TEST(SavedReportPages, AReloadedReportKeepsAPageLengthThatItsTextDoesNotTell)
     EXPECT_EQ(report->GetPages().size(), 2U);
 }
 
+TEST(SavedReportPages, APageLengthThatTheTextToldGoesWithTheText)
+{
+    const JobFolder files;
+    files.put("a.rep", "\xEF\xBB\xBF" + savedLines().join(QStringLiteral("\r\r\n")).toUtf8());
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    UReportDoc *report = kareport::openSavedReport(files.path("a.rep"));
+    ASSERT_NE(report, nullptr);
+    ASSERT_TRUE(report->IsPageFixed());
+    files.put("a.rep", "\xEF\xBB\xBFone\r\r\ntwo\r\r\n");
+    ASSERT_TRUE(kareport::reloadSavedReport(*report));
+    EXPECT_FALSE(report->IsPageFixed()) << "as if it were opened now";
+}
+
 } // namespace

@@ -174,6 +174,27 @@ TEST(UReportViewGivenPages, PagesArePrintedInAnyOrder)
     EXPECT_THAT(firstLines(readBack(printing.file()), 6), ElementsAre("page 3", "page 1", "page 3", "page 4"));
 }
 
+TEST(UReportViewGivenPages, AJobThatIsPreparedAgainHasThePagesThatTheReportHasThen)
+{
+    ShownReport report;
+    writePages(report.report, 4, 40, 30);
+    UReportView &view = report.open();
+    QPrinter printer(QPrinter::HighResolution);
+    printer.setOutputFormat(QPrinter::PdfFormat);
+    PrintInfo info;
+    info.printer = &printer;
+    info.direct = true;
+    report.report.SetPageSize();
+    ASSERT_TRUE(view.OnPreparePrinting(info));
+    EXPECT_EQ(info.maxPage, 4);
+    // The job cannot begin on the printer, so that nothing ends it; the text stays, its third page is one with the last.
+    std::vector<qint64> starts = report.report.GetPageStarts();
+    starts.pop_back();
+    report.report.SetPageStarts(starts);
+    ASSERT_TRUE(view.OnPreparePrinting(info));
+    EXPECT_EQ(info.maxPage, 3);
+}
+
 TEST(UReportViewGivenPages, RangesOrderAndCopiesAreTakenFromThePrinter)
 {
     struct Row

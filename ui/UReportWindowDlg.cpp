@@ -101,7 +101,7 @@ bool UReportWindowDlg::createAt(Qt::DockWidgetArea area, const QString &title, U
 
 long UReportWindowDlg::HandleInitDialog()
 {
-    givenUp_ = false;
+    givenUp_.reset();
     if (body_) {
         body_->list().setAccessibleName(Xlate("Report lines"));
     }

@@ -9,6 +9,8 @@
 #include <QPointer>
 
 #include <memory>
+#include <optional>
+#include <utility>
 
 class CReportToolBar;
 class QEvent;
@@ -85,8 +87,9 @@ public:
 
     void setActive(bool active) override;
     bool IsActive() const { return active_; }
-    /// Whether the user has closed the window and answered that the report is not to be saved.
-    bool IsGivenUp() const { return givenUp_; }
+    /// Whether the user has closed the window and answered that the report is not to be saved. What is written or edited
+    /// after the answer takes it back.
+    bool IsGivenUp() const;
     void takeFocus() override;
     /// The view to go back to; null for none or when it has gone.
     UView *GetPreviousView() const { return previousView_.get(); }
@@ -119,6 +122,6 @@ private:
     UReportDoc *report_ = nullptr; ///< may have gone
     kareport::RememberedView previousView_;
     bool active_ = false;
-    bool givenUp_ = false;
+    std::optional<std::pair<quint64, qint64>> givenUp_; ///< the edits and the length of the report that was given up
     QObject life_; ///< to see whether a question to the user has outlasted the window
 };

@@ -137,6 +137,12 @@ void UReportWindowDlg::ShowReport()
     report->UpdateAllViews(nullptr, 0, nullptr);
 }
 
+bool UReportWindowDlg::IsGivenUp() const
+{
+    const UReportDoc *report = GetReportDoc();
+    return givenUp_ && report != nullptr && *givenUp_ == std::pair(report->GetEditCount(), report->GetTextLength());
+}
+
 void UReportWindowDlg::OnPressCloseButton()
 {
     const QPointer<QObject> alive(&life_);
@@ -155,7 +161,10 @@ void UReportWindowDlg::OnPressCloseButton()
         if (!alive) {
             return; // the report was closed meanwhile, and this window with it
         }
-        givenUp_ = answer == MessageAnswer::No;
+        givenUp_.reset();
+        if (answer == MessageAnswer::No && GetReportDoc() != nullptr) {
+            givenUp_.emplace(GetReportDoc()->GetEditCount(), GetReportDoc()->GetTextLength());
+        }
     }
     if (GetReportDoc() != nullptr) {
         UReportDoc::ShowReportBar(this, false);

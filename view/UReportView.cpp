@@ -6,6 +6,7 @@
 #include "ReportContent.h"
 #include "ReportEdit.h"
 #include "ReportEntry.h"
+#include "ReportExit.h"
 #include "ReportViewWidget.h"
 #include "RichTextWriter.h"
 #include "SingleByteText.h"
@@ -311,18 +312,13 @@ void UReportView::OnMouseActivate()
     if (frame == nullptr || ancestor != frame) {
         return;
     }
-    UView *active = frame->GetActiveView();
-    if (active != this) {
-        frame->SetActiveViewForFrameAndPane(this);
-        OnActivateView(true, this, active);
+    const CViewPane *pane = frame->GetActivePane();
+    if (frame->GetActiveView() != this || pane != GetParentPane()) {
+        frame->SetActiveViewForFrameAndPane(this); // another view, or a pane without one, had the keyboard
         return;
     }
     const QWidget *focus = QApplication::focusWidget();
     if (focus == nullptr || (focus != widget_ && !widget_->isAncestorOf(focus))) {
-        const CViewPane *pane = frame->GetActivePane();
-        if (pane != GetParentPane()) {
-            frame->SetActiveViewForFrameAndPane(this); // a pane without a view had the keyboard
-        }
         OnActivateView(true, this, this);
     }
 }
@@ -338,7 +334,7 @@ void UReportView::OnReportExit()
 {
     UReportDoc *report = GetDocument();
     if (report != nullptr && report->GetReportWindow() != nullptr) {
-        report->SetCloseDocument(1);
+        kareport::deferCloseForExit(*report);
     }
     UXTPMDIFrameWnd *frame = UXTPMDIFrameWnd::Get();
     if (frame != nullptr && !frame->close()) {

@@ -153,7 +153,12 @@ void UReportView::OnReportPrint(bool direct)
     info.direct = direct;
     if (OnPreparePrinting(info)) {
         const QString name = nameOf(*info.printer);
-        sayOutcome(printText(*this, *info.printer, info, 0), name);
+        const PrintedText text(*this);
+        const PrintOutcome outcome = printText(*this, *info.printer, info, 0);
+        if (text.isOpen()) {
+            run_.reset(); // the printer goes, also where the job could not begin on it
+        }
+        sayOutcome(outcome, name);
     }
 }
 
@@ -194,6 +199,7 @@ void UReportView::OnReportPrintPreview()
 
 bool UReportView::OnPreparePrinting(PrintInfo &info)
 {
+    run_.reset(); // a job that could not begin has left its own, made for a printer that may have gone
     const UReportDoc *report = GetDocument();
     if (report == nullptr) {
         return false;

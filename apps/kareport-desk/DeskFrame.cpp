@@ -180,6 +180,7 @@ void DeskFrame::OfferLeftReports()
         names.append(kept.name() +
                      (kept.textFile.isEmpty() ? QString() : Xlate(" (with changes that were not saved)")));
     }
+    std::vector<kareport::KeptReport> notReopened;
     if (!left.empty()) {
         const MessageAnswer answer = kareport::showMessage(
             {Xlate("KaReport did not end properly the last time. These reports were open:\n\n%1\n\nOpen them again?")
@@ -195,6 +196,7 @@ void DeskFrame::OfferLeftReports()
                     activate(report);
                 } else {
                     lost.append(kept.name());
+                    notReopened.push_back(kept);
                 }
             }
         }
@@ -206,13 +208,14 @@ void DeskFrame::OfferLeftReports()
             return; // a full disk: what was left stays where it is
         }
     }
-    recovery_.discardLeft();
+    recovery_.discardLeft(notReopened);
 }
 
 void DeskFrame::NoteDocumentEvent(UDocument &document, UDocument::DocumentEvent event)
 {
     if (event == UDocument::DocumentEvent::AfterCloseDocument) {
         recovery_.forget(dynamic_cast<const UReportDoc *>(&document));
+        editors_.forget(dynamic_cast<const UReportDoc *>(&document));
     }
     // A document that has just been opened or saved under a new name gets its path behind the event.
     QMetaObject::invokeMethod(

@@ -52,8 +52,8 @@ void EditorHold::start(const EditorLaunch &launch)
 
 void EditorHold::showInstead(UReportDoc *report, const QString &program)
 {
-    std::erase(unstarted_, report);
-    if (UReportDoc::IsReportAvailable(report)) {
+    const bool isThere = std::erase(unstarted_, report) > 0;
+    if (isThere && UReportDoc::IsReportAvailable(report)) {
         report->SetExternalEditorFlag(false);
         report->SetModifiedFlag(true); // it is saved nowhere but in a temporary file
         report->UpdateAllViews(nullptr, 0, nullptr);
@@ -67,6 +67,12 @@ bool EditorHold::holds(const UReportDoc &report) const
     const bool isCopied = report.GetExternalEditorFlag() && !report.IsModified();
     return std::any_of(held_.begin(), held_.end(), isOfReport) || (isCopied && !held_.empty()) ||
            std::find(unstarted_.begin(), unstarted_.end(), &report) != unstarted_.end();
+}
+
+void EditorHold::forget(const UReportDoc *report)
+{
+    std::erase_if(held_, [report](const Held &held) { return held.report == report; });
+    std::erase(unstarted_, report);
 }
 
 void EditorHold::look()

@@ -25,6 +25,8 @@ public:
     /// Whether a program that was started for a report still runs, or is about to be said not to have started. A report that
     /// stands in one as a copy is held as long as any runs.
     bool holds(const UReportDoc &report) const;
+    /// A report has been closed: what comes in its place in memory is another one.
+    void forget(const UReportDoc *report);
 
 private:
     struct Held

@@ -114,6 +114,15 @@ void refuseWhatIsNoFile(const Job &job, JsonSource &source)
     }
 }
 
+/// Ends rich-text mode, which belongs to the files of a job: while it is on, the view shows what was written, and neither
+/// what is typed nor what is loaded.
+void endRichTextMode(UReportDoc *report)
+{
+    if (UReportDoc::IsReportAvailable(report)) {
+        report->SetRTFDataFlag(false);
+    }
+}
+
 UReportDoc *runJob(Expected<JsonSource> read, QWidget *parent, QString &error)
 {
     if (const InputError *wrong = errorOf(read)) {
@@ -139,6 +148,7 @@ UReportDoc *runJob(Expected<JsonSource> read, QWidget *parent, QString &error)
         try {
             wrong = runner.run();
         } catch (const std::bad_alloc &) {
+            endRichTextMode(runner.madeReport());
             closeReport(runner.madeReport()); // half a report is none
             throw;
         }
@@ -148,6 +158,7 @@ UReportDoc *runJob(Expected<JsonSource> read, QWidget *parent, QString &error)
         }
         isMade = !wrong && !isInterrupted();
     }
+    endRichTextMode(report);
     if (!isMade) {
         closeReport(report);
         return nullptr;

@@ -1,5 +1,6 @@
 #include "Recovery.h"
 
+#include "MemoryLasts.h"
 #include "PdfFile.h"
 #include "ReportEntry.h"
 #include "SavedReports.h"
@@ -16,6 +17,8 @@
 #include <QStandardPaths>
 #include <QUuid>
 
+#include <algorithm>
+#include <functional>
 #include <utility>
 
 namespace kareport
@@ -45,6 +48,43 @@ const UReportView *formattedView(const UReportDoc &report)
         }
     }
     return nullptr;
+}
+
+/// A text that a program kept; nothing when it cannot be read.
+std::optional<QString> readText(const QString &path)
+{
+    QFile file(path);
+    if (!RecoveryFolder(QFileInfo(path).path()).holdsText(path) || !file.open(QIODevice::ReadOnly)) {
+        return std::nullopt;
+    }
+    const QByteArray bytes = file.readAll();
+    return file.error() == QFileDevice::NoError ? std::optional(QString::fromUtf8(bytes)) : std::nullopt;
+}
+
+/// Gives a report the text that was kept of it. @return whether it has all of it
+bool fill(UReportDoc &report, const KeptReport &kept, const QString &text)
+{
+    report.SetData(text);
+    if (!kept.pageLines.empty()) {
+        report.SetPageStarts(startsOfLines(QStringView(text), kept.pageLines));
+    }
+    fixPage(report, kept);
+    if (!kept.path.isEmpty() && !isPdfName(kept.path)) {
+        report.SetPathName(kept.path, false);
+    }
+    report.UpdateAllViews(nullptr, 0, nullptr);
+    report.SetModifiedFlag(true);
+    return !report.HasLostText();
+}
+
+bool writeAll(const UReportDoc &report, QIODevice &device)
+{
+    return whileMemoryLasts(false, [&] {
+        const QString text = report.CopyText();
+        const QByteArray bytes = text.toUtf8();
+        // Without memory for a copy there is none; what was kept before is worth more.
+        return text.size() == report.GetTextLength() && device.write(bytes) == bytes.size();
+    });
 }
 
 std::vector<KeptReport> readList(const RecoveryFolder &folder)
@@ -135,14 +175,22 @@ std::vector<KeptReport> Recovery::leftReports() const
     return reports;
 }
 
-void Recovery::discardLeft()
+void Recovery::discardLeft(const std::vector<KeptReport> &lost)
 {
+    const auto isKept = [&lost](const Left &left) {
+        return std::any_of(lost.begin(), lost.end(), [&left](const KeptReport &kept) {
+            return !kept.textFile.isEmpty() && QFileInfo(kept.textFile).path() == left.folder.path() &&
+                   left.folder.holdsText(kept.textFile);
+        });
+    };
     for (const Left &left : left_) {
-        left.folder.removeFiles();
-        left.lock->unlock();
-        left.folder.removeIfEmpty();
+        if (!isKept(left)) {
+            left.folder.removeFiles();
+            left.lock->unlock();
+            left.folder.removeIfEmpty();
+        }
     }
-    left_.clear();
+    std::erase_if(left_, std::not_fn(isKept));
 }
 
 UReportDoc *Recovery::reopen(const KeptReport &kept)
@@ -154,25 +202,16 @@ UReportDoc *Recovery::reopen(const KeptReport &kept)
         }
         return saved;
     }
-    QFile file(kept.textFile);
-    if (!RecoveryFolder(QFileInfo(kept.textFile).path()).holdsText(kept.textFile) || !file.open(QIODevice::ReadOnly)) {
-        return nullptr;
+    UReportDoc *report = nullptr;
+    const bool isWhole = whileMemoryLasts(false, [&] {
+        const auto text = readText(kept.textFile);
+        report = text ? CreateReport(kept.title, true, false, nullptr, 0, nullptr) : nullptr;
+        return report != nullptr && fill(*report, kept, *text);
+    });
+    if (!isWhole && UReportDoc::IsReportAvailable(report)) {
+        report->OnCloseDocument(); // what is kept on the disk is all that there is
     }
-    UReportDoc *report = CreateReport(kept.title, true, false, nullptr, 0, nullptr);
-    if (report != nullptr) {
-        const QString text = QString::fromUtf8(file.readAll());
-        report->SetData(text);
-        if (!kept.pageLines.empty()) {
-            report->SetPageStarts(startsOfLines(QStringView(text), kept.pageLines));
-        }
-        fixPage(*report, kept);
-        if (!kept.path.isEmpty() && !isPdfName(kept.path)) {
-            report->SetPathName(kept.path, false);
-        }
-        report->UpdateAllViews(nullptr, 0, nullptr);
-        report->SetModifiedFlag(true);
-    }
-    return report;
+    return isWhole ? report : nullptr;
 }
 
 QString Recovery::textFileOf(const UReportDoc &report)
@@ -191,8 +230,7 @@ QString Recovery::textFileOf(const UReportDoc &report)
         if (view != nullptr) {
             return view->streamRichText(device);
         }
-        const QByteArray bytes = report.CopyText().toUtf8();
-        return device.write(bytes) == bytes.size();
+        return writeAll(report, device);
     });
     if (!isWritten) {
         isComplete_ = false; // a full disk: the next turn tries again, and what was written before stays

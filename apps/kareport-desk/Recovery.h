@@ -46,12 +46,13 @@ public:
 
     /// What programs that crashed had open, the reports that were opened first coming first.
     std::vector<KeptReport> leftReports() const;
-    /// Opens one of them again, with what was not saved. @return null when it cannot be opened
+    /// Opens one of them again, with what was not saved. @return null when it cannot be opened, or there is no memory for it
     static UReportDoc *reopen(const KeptReport &kept);
     /// Folders of programs that crashed whose lists cannot be read. They stay as they are.
     const QStringList &unreadableFolders() const { return unreadable_; }
-    /// Throws away what crashed programs left.
-    void discardLeft();
+    /// Throws away what crashed programs left. @param lost  what could not be opened again: a folder that holds such a text
+    /// stays, and is offered at the next start
+    void discardLeft(const std::vector<KeptReport> &lost = {});
 
     /// Writes down what is open now. Texts that have not changed since are not written again, and those that are being
     /// written by a job not yet. @return whether all of it is on the disk

@@ -1,6 +1,7 @@
 #include "SavedReports.h"
 
 #include "FileBytes.h"
+#include "MemoryLasts.h"
 #include "PdfFile.h"
 #include "ReportContent.h"
 #include "ReportEntry.h"
@@ -61,7 +62,8 @@ UReportDoc *withPageLength(UReportDoc *report)
     return report;
 }
 
-void fill(UReportDoc &report, const QString &text)
+/// @return whether the report has all of the text
+bool fill(UReportDoc &report, const QString &text)
 {
     report.Clear();
     keepPageLength(report, text);
@@ -70,6 +72,37 @@ void fill(UReportDoc &report, const QString &text)
     report.FindPageStarts();
     report.UpdateAllViews(nullptr, 0, nullptr);
     report.SetModifiedFlag(false);
+    return !report.HasLostText();
+}
+
+/// A page length that only the text told goes with the text. One that was given otherwise, as by a job, stays.
+void forgetPageLengthOfText(UReportDoc &report)
+{
+    if (report.GetGivenLinesPerPage() && report.GetGivenLinesPerPage() == linesOfPages(shownPlainText(report))) {
+        report.FixPage(std::nullopt, std::nullopt);
+        report.SetPageSize();
+    }
+}
+
+bool reload(UReportDoc &report)
+{
+    if (!whyNotOpened(report.GetPathName()).isEmpty() || !QFile(report.GetPathName()).open(QIODevice::ReadOnly)) {
+        return false; // what is shown is then all that there is
+    }
+    const auto read = exactText(report.GetPathName());
+    if (errorOf(read) != nullptr) {
+        return false;
+    }
+    report.SetRTFDataFlag(false); // in rich-text mode nothing is loaded
+    forgetPageLengthOfText(report);
+    if (const auto &text = std::get<std::optional<QString>>(read)) {
+        return fill(report, *text);
+    }
+    report.Clear();
+    const bool isLoaded = report.OnOpenDocument(report.GetPathName());
+    withPageLength(&report);
+    report.UpdateAllViews(nullptr, 0, nullptr);
+    return isLoaded;
 }
 
 } // namespace
@@ -102,7 +135,10 @@ UReportDoc *openSavedReport(const QString &path)
     }
     UReportDoc *report = CreateReport(QString(), true, false, nullptr, 0, nullptr);
     if (report != nullptr) {
-        fill(*report, *text);
+        if (!fill(*report, *text)) {
+            report->OnCloseDocument();
+            return nullptr;
+        }
         report->SetPathName(path, true);
         report->OnDocumentEvent(UDocument::DocumentEvent::AfterOpenDocument);
     }
@@ -111,22 +147,7 @@ UReportDoc *openSavedReport(const QString &path)
 
 bool reloadSavedReport(UReportDoc &report)
 {
-    if (!whyNotOpened(report.GetPathName()).isEmpty() || !QFile(report.GetPathName()).open(QIODevice::ReadOnly)) {
-        return false; // what is shown is then all that there is
-    }
-    const auto read = exactText(report.GetPathName());
-    if (errorOf(read) != nullptr) {
-        return false;
-    }
-    if (const auto &text = std::get<std::optional<QString>>(read)) {
-        fill(report, *text);
-        return true;
-    }
-    report.Clear();
-    const bool isLoaded = report.OnOpenDocument(report.GetPathName());
-    withPageLength(&report);
-    report.UpdateAllViews(nullptr, 0, nullptr);
-    return isLoaded;
+    return whileMemoryLasts(false, [&report] { return reload(report); });
 }
 
 } // namespace kareport

@@ -108,6 +108,9 @@ protected:
     void closeEvent(QCloseEvent *event) override
     {
         for (UDocument *report : std::vector(GetReportTemplate()->GetDocuments())) {
+            if (!UApplication::Get()->IsOpen(report)) {
+                continue; // it was closed while the user was asked about another one
+            }
             event->setAccepted(event->isAccepted() && report->SaveModified()); // the user may cancel
         }
         if (!event->isAccepted()) {

@@ -2,6 +2,7 @@
 
 #include "COneViewPane.h"
 #include "PaneDock.h"
+#include "RememberedView.h"
 #include "UView.h"
 
 #include <QApplication>
@@ -36,6 +37,36 @@ bool hasLostWindow()
     const QWidget *window = keyboardWindow();
     return hadWindow && QApplication::activeWindow() == nullptr &&
            (window == nullptr || !window->isWindow() || !window->isVisible());
+}
+
+bool hasKeyboard(UView &view)
+{
+    const QWidget *widget = view.GetWidget();
+    const QWidget *focus = widget != nullptr ? widget->window()->focusWidget() : nullptr;
+    return focus != nullptr && (focus == widget || widget->isAncestorOf(focus));
+}
+
+/// Makes a view the active one and tells the one before. @return the one before, unless it has gone since
+kareport::RememberedView replaceActive(UView *&active, UView *view)
+{
+    const kareport::RememberedView before(active);
+    active = view;
+    if (before.get() != nullptr && before.get() != view) {
+        before.get()->OnActivateView(false, view, before.get());
+    }
+    return before;
+}
+
+/// Makes a view the active one, and tells it and the one before: each once. Whatever is told may close either.
+void activate(UView *&active, UView *view)
+{
+    const kareport::RememberedView before = replaceActive(active, view);
+    if (view == nullptr || active != view) {
+        return;
+    }
+    if (before.get() != view || !hasKeyboard(*view)) {
+        view->OnActivateView(true, view, before.get());
+    }
 }
 
 } // namespace
@@ -75,17 +106,8 @@ void UXTPMDIFrameWnd::TakePane(COneViewPane &pane)
     std::erase(usedPanes_, &pane);
     usedPanes_.push_back(&pane);
     activePane_ = &pane;
-    UView *view = pane.GetActiveView();
-    UView *previous = activeView_;
-    if (view != nullptr && view != previous) {
-        activeView_ = view;
-        if (previous != nullptr) {
-            previous->OnActivateView(false, view, previous);
-        }
-    }
-    // Whatever is told may close a pane.
-    if (view != nullptr && activeView_ == view) {
-        view->OnActivateView(true, view, previous);
+    if (UView *view = pane.GetActiveView()) {
+        activate(activeView_, view);
     }
     UpdateCommands();
 }
@@ -111,7 +133,6 @@ void UXTPMDIFrameWnd::ActivatePane(COneViewPane &pane)
 
 void UXTPMDIFrameWnd::SetActiveViewForFrameAndPane(UView *view)
 {
-    activeView_ = view;
     auto *pane = view != nullptr ? dynamic_cast<COneViewPane *>(view->GetParentPane()) : nullptr;
     if (pane != nullptr && pane->IsVisible() && PaneOf(pane->GetDock()) == pane) {
         if (!pane->IsInFront()) {
@@ -122,6 +143,14 @@ void UXTPMDIFrameWnd::SetActiveViewForFrameAndPane(UView *view)
     }
     if (activePane_ != nullptr && activePane_->GetActiveView() != nullptr) {
         activePane_ = nullptr;
+    }
+    if (view == nullptr || view->GetParentPane() == nullptr || view->GetParentPane()->IsVisible()) {
+        activate(activeView_, view);
+    } else {
+        // Nobody sees it: it cannot take the keyboard, and is told when its pane is shown. The pane where the keyboard
+        // is gets its commands back.
+        replaceActive(activeView_, view);
+        SettleLater();
     }
     UpdateCommands();
 }

@@ -16,11 +16,12 @@ namespace
 {
 
 thread_local constinit qint64 left = 0;
+thread_local constinit std::size_t least = 0;
 thread_local constinit bool isRefused = false;
 
-bool refuses()
+bool refuses(std::size_t bytes)
 {
-    if (left == 0 || --left > 0) {
+    if (left == 0 || bytes < least || --left > 0) {
         return false;
     }
     isRefused = true;
@@ -35,23 +36,23 @@ extern "C" {
 
 __attribute__((visibility("default"))) void *malloc(std::size_t size)
 {
-    return refuses() ? nullptr : __libc_malloc(size);
+    return refuses(size) ? nullptr : __libc_malloc(size);
 }
 __attribute__((visibility("default"))) void *calloc(std::size_t count, std::size_t size)
 {
-    return refuses() ? nullptr : __libc_calloc(count, size);
+    return refuses(count * size) ? nullptr : __libc_calloc(count, size);
 }
 __attribute__((visibility("default"))) void *realloc(void *memory, std::size_t size)
 {
-    return refuses() ? nullptr : __libc_realloc(memory, size);
+    return refuses(size) ? nullptr : __libc_realloc(memory, size);
 }
 __attribute__((visibility("default"))) void *aligned_alloc(std::size_t alignment, std::size_t size)
 {
-    return refuses() ? nullptr : __libc_memalign(alignment, size);
+    return refuses(size) ? nullptr : __libc_memalign(alignment, size);
 }
 __attribute__((visibility("default"))) int posix_memalign(void **memory, std::size_t alignment, std::size_t size)
 {
-    void *made = refuses() ? nullptr : __libc_memalign(alignment, size);
+    void *made = refuses(size) ? nullptr : __libc_memalign(alignment, size);
     if (made == nullptr) {
         return ENOMEM;
     }
@@ -61,8 +62,9 @@ __attribute__((visibility("default"))) int posix_memalign(void **memory, std::si
 }
 // NOLINTEND(bugprone-reserved-identifier)
 
-FailingAllocation::FailingAllocation(qint64 number)
+FailingAllocation::FailingAllocation(qint64 number, std::size_t leastBytes)
 {
+    least = leastBytes;
     isRefused = false;
     left = number;
 }

@@ -326,6 +326,7 @@ protected:
         EXPECT_TRUE(report.Write(QStringLiteral("after"), 0));
         EXPECT_TRUE(report.CopyText() == text + QStringLiteral("after"));
         if (report.HasLostText()) {
+            EXPECT_EQ(report.LoadFile(around_.loadPath, false), 1) << "that file is there as a whole";
             putFile(around_.reportPath, "earlier");
             EXPECT_FALSE(report.OnSaveDocument(around_.reportPath)) << "half a report is saved";
             EXPECT_EQ(contentOf(around_.reportPath), "earlier");

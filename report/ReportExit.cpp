@@ -1,0 +1,66 @@
+#include "ReportExit.h"
+
+#include "ReportEntry.h"
+#include "UReportDoc.h"
+
+#include <algorithm>
+#include <vector>
+
+namespace
+{
+
+/// A report whose closing an exit has deferred.
+struct DeferredReport
+{
+    UReportDoc *report;
+    bool isAskedToClose;
+};
+
+std::vector<DeferredReport> &deferredReports()
+{
+    static std::vector<DeferredReport> reports;
+    return reports;
+}
+
+auto placeOf(const UReportDoc &report)
+{
+    return std::find_if(deferredReports().begin(), deferredReports().end(),
+                        [&report](const DeferredReport &deferred) { return deferred.report == &report; });
+}
+
+} // namespace
+
+void kareport::deferCloseForExit(UReportDoc &report)
+{
+    forgetExit(report);
+    deferredReports().push_back({&report, false});
+    report.SetCloseDocument(1);
+}
+
+void kareport::noteCloseAsked(const UReportDoc &report)
+{
+    if (const auto place = placeOf(report); place != deferredReports().end()) {
+        place->isAskedToClose = true;
+    }
+}
+
+void kareport::forgetExit(const UReportDoc &report)
+{
+    if (const auto place = placeOf(report); place != deferredReports().end()) {
+        deferredReports().erase(place);
+    }
+}
+
+void kareport::noteExitCancelled()
+{
+    // A report that closes may close others, which leave the list.
+    while (!deferredReports().empty()) {
+        const DeferredReport deferred = deferredReports().back();
+        deferredReports().pop_back();
+        if (deferred.isAskedToClose) {
+            deferred.report->CloseReportDocument();
+        } else {
+            deferred.report->SetCloseDocument(0);
+        }
+    }
+}
