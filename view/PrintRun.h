@@ -18,7 +18,10 @@ namespace kareport
 struct PrintRun
 {
     PrintRun(QTextDocument &text, QPaintDevice &device)
-        : document(&text), revision(text.revision()), pager(text, device)
+        : document(&text),
+          revision(text.revision()),
+          resolution(device.logicalDpiX(), device.logicalDpiY()),
+          pager(text, device)
     {}
 
     /// Whether it is about this text as it is now, on this device as it is set up.
