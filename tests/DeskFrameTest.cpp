@@ -538,7 +538,9 @@ TEST(DeskFrame, WhatIsTypedAfterAReportWasGivenUpIsNotThrownAway)
         if (row.isTyped) {
             QTest::keyClick(&view->GetEdit(), Qt::Key_X);
         }
-        view->GetParentPane()->ShowPane(false);
+        for (UView *each : report->GetViews()) {
+            each->GetParentPane()->ShowPane(false);
+        }
         EXPECT_TRUE(QTest::qWaitFor([report] { return !UReportDoc::IsReportAvailable(report) || report->IsShown(); }))
             << row.reason;
         EXPECT_EQ(UReportDoc::IsReportAvailable(report), row.isTyped) << row.reason;
