@@ -143,7 +143,8 @@ Recovery::~Recovery()
 {
     if (lock_ && !folder_->isOurs()) {
         // Something else has taken the folder's name meanwhile: unlocking would remove its lock.
-        static_cast<void>(lock_.release());
+        static auto *const left = new std::vector<QLockFile *>; // for as long as the program runs
+        left->push_back(lock_.release());
     } else if (lock_) {
         folder_->removeFiles();
         lock_->unlock();
