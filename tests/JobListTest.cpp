@@ -118,8 +118,8 @@ TEST(JobList, HasANameOnEachLine)
          {QString::fromUtf8("\xC3\xA4\xE7\xB7\x9A\xF0\x9F\x98\x80.json")},
          "names in UTF-8"},
         {QByteArray("a\nb.json\0c.json\0", 16), {"a\nb.json", "c.json"}, "names with a line end, ended by 0 bytes"},
-        {QByteArray("a.json\0b.json", 13), {"a.json", "b.json"}, "no 0 byte behind the last"},
-        {QByteArray("a.json\0\n", 8), {"a.json"}, "a line end behind the last 0 byte"},
+        {QByteArray("a.json\0b.json", 13), {"a.json", "b.json"}, "no 0 byte after the last"},
+        {QByteArray("a.json\0\n", 8), {"a.json"}, "a line end after the last 0 byte"},
         {"#a.json\n", {"#a.json"}, "no comments: a name may begin so"},
     };
     const JobFolder folder;

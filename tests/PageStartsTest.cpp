@@ -57,7 +57,7 @@ TEST(PageStarts, AnEditCarriesThemAlong)
     const QString lineEnd = QStringLiteral("\r\n");
     const Row rows[] = {
         {0, 0, QString(), {0, 10, 20}, "nothing"},
-        {5, 0, QStringLiteral("x"), {0, 11, 21}, "a letter in a page moves those behind it"},
+        {5, 0, QStringLiteral("x"), {0, 11, 21}, "a letter in a page moves those after it"},
         {12, 0, QStringLiteral("xyz"), {0, 10, 23}, "and only those"},
         {10, 0, QStringLiteral("x"), {0, 10, 21}, "a letter at a page's start is the page's"},
         {10, 0, lineEnd, {0, 12, 22}, "a line end there is the page's before"},

@@ -117,7 +117,7 @@ public:
             write(line.endsWith(u'\r') ? line.chopped(1) : line);
             lineFeed(1);
         }
-        if (!cells_.empty()) { // behind the last line feed there was no line
+        if (!cells_.empty()) { // after the last line feed there was no line
             cells_.resize(cells_.size() - 2);
             --lineNumber_;
             --lineCount_;

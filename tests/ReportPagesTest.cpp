@@ -45,7 +45,7 @@ TEST(ReportPages, PagesOfATextByItsStartsAndByLines)
         {three, {6}, 1, QStringLiteral("0-3/1 3-6/1 6-9/1"), "text before the first start by counting lines"},
         {three, {0, 4, 6}, 2, QStringLiteral("0-6/2 6-9/1"), "a start within a line counts for nothing"},
         {three, {4}, 2, QStringLiteral("0-6/2 6-9/1"), "also as the only one"},
-        {three, {0, 9, 20}, 2, QStringLiteral("0-9/3"), "nothing begins behind the text"},
+        {three, {0, 9, 20}, 2, QStringLiteral("0-9/3"), "nothing begins after the text"},
         {three, {-3, 0, 0, 3, 3}, 2, QStringLiteral("0-3/1 3-9/2"), "doubles and negative places are passed over"},
         {three + blank + blank + three,
          {0, 13},

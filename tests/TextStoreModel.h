@@ -120,7 +120,7 @@ private:
     }
     qint64 rest(qint64 at, qint64 count) const { return count % (model_.size() - at + 1); }
 
-    /// What an operation that needs memory answered: false only for want of it.
+    /// What an operation that needs memory answered: false only where memory has ended.
     bool answered(bool answer)
     {
         expect(answer || FailingMemory::hasRefused, "it answers false although there is memory");

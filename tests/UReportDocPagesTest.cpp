@@ -120,7 +120,7 @@ TEST_F(UReportDocPages, ArePagesOfTheirWriterWhateverIsOnThem)
              r.SetData(QStringLiteral("a\r\nb\r\n"));
              rows(r, 1);
          },
-         u"2 5", "a text and pages behind it"},
+         u"2 5", "a text and pages after it"},
         {[](UReportDoc &r) {
              r.SetData(QStringLiteral("a\r\nb"));
              rows(r, 1);
