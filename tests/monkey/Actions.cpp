@@ -332,7 +332,6 @@ void endEditor(World &world, Chance & /*chance*/)
 
 void exitDesk(World &world, Chance &chance)
 {
-    world.isExit = true;
     if (chance.oneIn(2)) {
         runCommand(world, kareport::exitCommand);
     } else {

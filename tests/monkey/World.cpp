@@ -210,7 +210,7 @@ QHash<QString, Stamp> World::lookAtFiles() const
 {
     QHash<QString, Stamp> stamps;
     for (const QFileInfo &info : files().entryInfoList(QDir::Files)) {
-        stamps.insert(info.filePath(), {info.lastModified(), info.size(), 0});
+        stamps.insert(info.filePath(), {info.lastModified(), info.size()});
     }
     return stamps;
 }
@@ -223,7 +223,6 @@ void World::note()
     answers_.take();
     mayChange.clear();
     mayReload = false;
-    isExit = false;
     did.clear();
 }
 

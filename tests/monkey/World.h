@@ -37,7 +37,6 @@ struct Stamp
 {
     QDateTime modified;
     qint64 size = -1;
-    quint64 inode = 0; ///< a file that was replaced is another one
 
     bool operator==(const Stamp &) const = default;
 };
@@ -81,13 +80,11 @@ public:
     [[noreturn]] void crash();
     /// Whether reports that were lost in a crash have come back. @return what is wrong
     QString checkRecovered();
-    QString lastPath() const; ///< a name of a file that is there
     QString newPath(Chance &chance) const;
 
     // What the step that runs says of itself.
     std::set<const UReportDoc *> mayChange; ///< texts that it edits
     bool mayReload = false;                 ///< files were changed by somebody else
-    bool isExit = false;
     QString did; ///< in words, for the log
 
 private:
