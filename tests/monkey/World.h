@@ -85,7 +85,7 @@ public:
     // What the step that runs says of itself.
     std::set<const UReportDoc *> mayChange; ///< texts that it edits
     bool mayReload = false;                 ///< files were changed by somebody else
-    QString did; ///< in words, for the log
+    QString did;                            ///< in words, for the log
 
 private:
     class Application;
