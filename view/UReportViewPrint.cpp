@@ -20,6 +20,7 @@
 #include <QPrinter>
 #include <QTextDocument>
 
+#include <memory>
 #include <stdexcept>
 
 namespace
@@ -53,21 +54,21 @@ class PrintedText
 {
 public:
     explicit PrintedText(UReportView &view)
-        : widget_(view.GetWidget()), text_(view.GetEdit().document()), revision_(text_->revision()), view_(view)
+        : view_(view.GetHandle()), text_(view.GetEdit().document()), revision_(text_->revision())
     {}
 
     bool isUnchanged() const
     {
-        return widget_ != nullptr && text_ != nullptr && view_.GetEdit().document() == text_ &&
+        return isOpen() && text_ != nullptr && static_cast<UReportView *>(*view_)->GetEdit().document() == text_ &&
                text_->revision() == revision_;
     }
-    bool isOpen() const { return widget_ != nullptr; }
+    /// Whether the view is still there. Its widget is no sign of that: it may outlive the view.
+    bool isOpen() const { return *view_ != nullptr; }
 
 private:
-    QPointer<QWidget> widget_;
+    std::shared_ptr<UView *const> view_;
     QPointer<QTextDocument> text_;
     int revision_;
-    UReportView &view_;
 };
 
 void sayNoRoom()
