@@ -1,4 +1,5 @@
 #include "ActivePaneFixture.h"
+#include "EditorFixture.h"
 
 #include <QClipboard>
 
@@ -268,6 +269,25 @@ TEST_F(ActivePane, AHiddenPaneDoesNotKeepAReport)
     dockPaneOf(*report).ShowPane(true);
     EXPECT_EQ(dockPaneOf(*report).GetWindowNumber(), 1) << "counted again";
     EXPECT_EQ(dockPaneOf(*report, 1).GetWindowNumber(), 2);
+}
+
+TEST_F(ActivePane, AnEditorThatHidesAPaneDoesNotKeepAReport)
+{
+    UReportDoc *report = reports[0];
+    report->Activate(true);
+    const PreferredEditor editor(QStringLiteral("notepad.exe"));
+    const RecordedLaunches launches;
+    report->SetExternalEditorFlag(true);
+    report->UpdateAllViews(nullptr); // the editor gets the report, and the first pane goes
+    ASSERT_EQ(launches.all.size(), 1U);
+    ASSERT_FALSE(dockPaneOf(*report).IsVisible());
+    EXPECT_EQ(dockPaneOf(*report).GetWindowNumber(), 0);
+    report->SetExternalEditorFlag(false);
+    report->SetModifiedFlag(true);
+    const AnsweredBoxes boxes(MessageAnswer::Cancel);
+    dockPaneOf(*report, 1).GetDock()->close();
+    EXPECT_EQ(boxes.boxes.size(), 1U) << "the only pane that is left is not closed without a question";
+    EXPECT_TRUE(UReportDoc::IsReportAvailable(report));
 }
 
 class RefusingFrame : public UXTPMDIFrameWnd
