@@ -136,9 +136,10 @@ void UXTPMDIFrameWnd::SetActiveViewForFrameAndPane(UView *view)
     auto *pane = view != nullptr ? dynamic_cast<COneViewPane *>(view->GetParentPane()) : nullptr;
     if (pane != nullptr && pane->IsVisible() && PaneOf(pane->GetDock()) == pane) {
         if (!pane->IsInFront()) {
-            pane->GetDock()->raise();
+            pane->BringToTop();
+        } else {
+            ActivatePane(*pane);
         }
-        ActivatePane(*pane);
         return;
     }
     if (activePane_ != nullptr && activePane_->GetActiveView() != nullptr) {

@@ -98,7 +98,7 @@ void COneViewPane::BringToTop()
     if (!IsVisible()) {
         return;
     }
-    dock_->raise();
+    dock_->comeToFront();
     if (UXTPMDIFrameWnd *frame = UXTPMDIFrameWnd::Get()) {
         frame->ActivatePane(*this);
     } else if (dock_->widget() != nullptr) {

@@ -9,6 +9,7 @@
 #include <QPointer>
 #include <QStyleOptionDockWidget>
 #include <QStylePainter>
+#include <QTabBar>
 
 #include <algorithm>
 
@@ -104,6 +105,23 @@ bool PaneDock::isBehindTab() const
     return !isWindow() && (geometry().right() < 0 || geometry().bottom() < 0);
 }
 
+void PaneDock::comeToFront()
+{
+    raise();
+    if (isWindow() || parentWidget() == nullptr || parentWidget() == frameOf(*this)) {
+        return;
+    }
+    // Raising changes the tab only where the frame is the parent, not in a window in which panes float as tabs.
+    for (QTabBar *tabs : parentWidget()->findChildren<QTabBar *>(QString(), Qt::FindDirectChildrenOnly)) {
+        for (int tab = 0; tab < tabs->count(); ++tab) {
+            if (tabs->tabData(tab).value<quintptr>() == reinterpret_cast<quintptr>(this)) {
+                tabs->setCurrentIndex(tab);
+            }
+        }
+    }
+    parentWidget()->raise();
+}
+
 void PaneDock::setVisible(bool visible)
 {
     const bool wasHidden = isHidden();
@@ -121,10 +139,26 @@ void PaneDock::activatePane()
     }
 }
 
+void PaneDock::noteFront()
+{
+    const bool isInFront = pane_ != nullptr && pane_->IsInFront();
+    if (wasInFront_ == isInFront) {
+        return;
+    }
+    wasInFront_ = isInFront;
+    // A window in which panes float as tabs does not tell the frame when it places them anew.
+    if (UXTPMDIFrameWnd *frame = UXTPMDIFrameWnd::Get(); frame != nullptr && pane_ != nullptr) {
+        frame->SettleLater();
+    }
+}
+
 bool PaneDock::event(QEvent *event)
 {
     const QPointer<PaneDock> self(this);
     const bool taken = QDockWidget::event(event);
+    if (self && (event->type() == QEvent::Move || event->type() == QEvent::Show || event->type() == QEvent::Hide)) {
+        noteFront();
+    }
     // A press that nothing in the pane took, as on its title, and a window of its own that comes to the front.
     const bool isPressed =
         event->type() == QEvent::MouseButtonPress || event->type() == QEvent::NonClientAreaMouseButtonPress;

@@ -31,6 +31,8 @@ public:
     void standAlone();
     /// Whether the tab of another dock widget stands before it.
     bool isBehindTab() const;
+    /// Comes before the other tabs of its row and, where it floats, before other windows.
+    void comeToFront();
 
     void setVisible(bool visible) override;
 
@@ -42,10 +44,13 @@ protected:
 private:
     void showCaption();
     void activatePane();
+    /// Lets the frame choose the active pane anew when the pane came to the front or went from it.
+    void noteFront();
 
     COneViewPane *pane_;
     QString caption_;
     bool marked_ = false;
+    bool wasInFront_ = false;
 };
 
 } // namespace kareport

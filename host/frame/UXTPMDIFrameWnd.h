@@ -9,6 +9,11 @@
 
 #include <vector>
 
+namespace kareport
+{
+class PaneDock;
+}
+
 class COneViewPane;
 class CViewPane;
 class QMenu;
@@ -68,6 +73,7 @@ protected:
 
 private:
     friend class COneViewPane;
+    friend class kareport::PaneDock;
 
     void LeavePane(const COneViewPane &pane);
     void ForgetPane(const COneViewPane &pane);

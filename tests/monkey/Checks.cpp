@@ -2,6 +2,7 @@
 
 #include "COneViewPane.h"
 #include "DeskFrame.h"
+#include "PaneDock.h"
 #include "ReportEdit.h"
 #include "ReportTextDecoder.h"
 #include "UReportDoc.h"
@@ -56,6 +57,37 @@ QString difference(const QString &one, const QString &other)
         .arg(around(one, at), around(other, at));
 }
 
+/// How the panes stand, for whoever reads the log.
+QString panesOf(const DeskFrame &frame)
+{
+    const COneViewPane *active = frame.GetActivePane();
+    QStringList lines;
+    for (const QDockWidget *dock : frame.findChildren<QDockWidget *>()) {
+        const auto *paneDock = dynamic_cast<const kareport::PaneDock *>(dock);
+        const COneViewPane *pane = paneDock != nullptr ? paneDock->pane() : nullptr;
+        const QRect place = dock->geometry();
+        lines.append(QStringLiteral("  %1%2%3%4%5 at %6,%7 of %8 x %9")
+                         .arg(dock->windowTitle(), dock->isHidden() ? QStringLiteral(", hidden") : QString(),
+                              dock->isFloating()         ? QStringLiteral(", floats")
+                              : dock->window() != &frame ? QStringLiteral(", floats with others")
+                                                         : QString(),
+                              pane == nullptr       ? QStringLiteral(", left by its pane")
+                              : pane->IsInFront()   ? QStringLiteral(", in front")
+                                                    : QString(),
+                              pane != nullptr && pane == active ? QStringLiteral(", active") : QString())
+                         .arg(place.x())
+                         .arg(place.y())
+                         .arg(place.width())
+                         .arg(place.height()));
+    }
+    const QWidget *focus = QApplication::focusWidget();
+    const QWidget *window = QApplication::activeWindow();
+    return QStringLiteral("\n%1\n  keyboard in %2, active window %3")
+        .arg(lines.join(u'\n'),
+             focus != nullptr ? QLatin1String(focus->metaObject()->className()) : QLatin1String("nothing"),
+             window != nullptr ? QLatin1String(window->metaObject()->className()) : QLatin1String("none"));
+}
+
 /// A text with the line ends that a control has.
 QString asShown(QString text)
 {
@@ -81,7 +113,7 @@ QString World::check()
          {&World::checkClosed, &World::checkTexts, &World::checkWindows, &World::checkActive, &World::checkPages})
     {
         if (const QString wrong = (this->*part)(); !wrong.isEmpty()) {
-            return wrong;
+            return wrong + panesOf(*frame_);
         }
     }
     return {};

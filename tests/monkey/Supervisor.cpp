@@ -98,7 +98,7 @@ Outcome Supervisor::run(const Steps &steps)
         const QString done = readAll(folder.filePath(doneName));
         const QStringList lines = done.split(u'\n', Qt::SkipEmptyParts);
         outcome.step = static_cast<std::size_t>(lines.size());
-        outcome.done = lines.mid(std::max<qsizetype>(0, lines.size() - 12)).join(u'\n');
+        outcome.done = lines.mid(std::max<qsizetype>(0, lines.size() - 40)).join(u'\n');
         if (worker.exitStatus() == QProcess::NormalExit && worker.exitCode() == workerIsDone) {
             return outcome;
         }

@@ -1,0 +1,77 @@
+#include "ActivePaneFixture.h"
+#include "DeskCommandIds.h"
+#include "DeskFixture.h"
+
+// Panes that float together: a row of tabs that was dragged out of the frame stands in a window of its own.
+
+namespace
+{
+
+void settle()
+{
+    QCoreApplication::processEvents();
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    QCoreApplication::processEvents();
+}
+
+/// A desk with reports whose panes were dragged out of the frame by the title of the one in front.
+class FloatingPanes : public testing::Test
+{
+protected:
+    FloatingPanes() { desk.answer = MessageAnswer::No; }
+
+    UReportDoc *open(const char *name)
+    {
+        folder.put(name, "a line\n");
+        EXPECT_TRUE(desk.frame->OpenFile(folder.path(name)));
+        settle();
+        return Desk::reports().back();
+    }
+
+    void dragOut(const UReportDoc &report)
+    {
+        QDockWidget *dock = dockPaneOf(report).GetDock();
+        const QPoint title(40, 8);
+        const QPoint way(160, 190);
+        QTest::mousePress(dock, Qt::LeftButton, Qt::NoModifier, title);
+        for (int part = 1; part <= 4; ++part) {
+            QTest::mouseMove(dock, title + way * part / 4);
+        }
+        QTest::mouseRelease(dock, Qt::LeftButton, Qt::NoModifier, title + way);
+        settle();
+        settle();
+        EXPECT_NE(dock->window(), desk.frame.operator->());
+    }
+
+    JobFolder folder;
+    Desk desk;
+};
+
+TEST_F(FloatingPanes, WhatIsLeftInTheirWindowIsActiveWhenTheOneInFrontIsClosed)
+{
+    const UReportDoc *first = open("first.rep");
+    const UReportDoc *second = open("second.rep");
+    dragOut(*second);
+    ASSERT_FALSE(dockPaneOf(*first).IsInFront());
+    ASSERT_TRUE(desk.frame->OnCommand(kareport::fileCloseCommand));
+    settle();
+    ASSERT_FALSE(UReportDoc::IsReportAvailable(second));
+    EXPECT_EQ(wrongWithActive(*desk.frame), QString());
+    EXPECT_EQ(desk.frame->GetCommandDocument(), first);
+}
+
+TEST_F(FloatingPanes, AReportWhoseFileIsOpenComesBeforeTheOtherTabs)
+{
+    const UReportDoc *first = open("first.rep");
+    const UReportDoc *second = open("second.rep");
+    dragOut(*second);
+    for (const UReportDoc *report : {first, second}) {
+        ASSERT_TRUE(desk.frame->OpenFile(report->GetPathName()));
+        settle();
+        EXPECT_EQ(wrongWithActive(*desk.frame), QString());
+        EXPECT_TRUE(dockPaneOf(*report).IsInFront());
+        EXPECT_EQ(desk.frame->GetCommandDocument(), report);
+    }
+}
+
+} // namespace
