@@ -47,6 +47,16 @@ protected:
     Desk desk;
 };
 
+TEST_F(FloatingPanes, HaveTheKeyboardInTheTextOfTheOneThatWasDragged)
+{
+    open("first.rep");
+    const UReportDoc *second = open("second.rep");
+    dragOut(*second);
+    EXPECT_EQ(wrongWithActive(*desk.frame), QString());
+    EXPECT_EQ(desk.frame->GetCommandDocument(), second);
+    EXPECT_TRUE(editOf(*second).hasFocus());
+}
+
 TEST_F(FloatingPanes, WhatIsLeftInTheirWindowIsActiveWhenTheOneInFrontIsClosed)
 {
     const UReportDoc *first = open("first.rep");

@@ -84,17 +84,19 @@ COneViewPane *UXTPMDIFrameWnd::PaneOf(const QWidget *widget) const
     return widget == this && dock != nullptr ? dock->pane() : nullptr;
 }
 
-COneViewPane *UXTPMDIFrameWnd::PaneInFront() const
+COneViewPane *UXTPMDIFrameWnd::PaneInFront(const QWidget *window) const
 {
-    const auto used = std::find_if(usedPanes_.rbegin(), usedPanes_.rend(),
-                                   [](const COneViewPane *pane) { return pane->IsInFront(); });
+    const auto isInFront = [window](const COneViewPane *pane) {
+        return pane->IsInFront() && (window == nullptr || pane->GetDock()->window() == window);
+    };
+    const auto used = std::find_if(usedPanes_.rbegin(), usedPanes_.rend(), isInFront);
     if (used != usedPanes_.rend()) {
         return *used;
     }
     COneViewPane *inFront = nullptr;
     for (const QDockWidget *dock : findChildren<QDockWidget *>()) {
         COneViewPane *pane = PaneOf(dock);
-        if (pane != nullptr && pane->IsInFront() && (inFront == nullptr || pane->GetActiveView() != nullptr)) {
+        if (pane != nullptr && isInFront(pane) && (inFront == nullptr || pane->GetActiveView() != nullptr)) {
             inFront = pane;
         }
     }
@@ -216,6 +218,13 @@ void UXTPMDIFrameWnd::SettlePanes()
         }
         return;
     }
+    if (focus != nullptr && focus == tabsOfNewWindow_) {
+        tabsOfNewWindow_ = nullptr;
+        if (COneViewPane *shown = PaneInFront(focus->window())) {
+            ActivatePane(*shown);
+            return;
+        }
+    }
     // The keyboard is in a pane that nobody sees, or was in one that has gone; a menu or a bar may have it.
     const bool isLost =
         focus == nullptr ? hasLostWindow() || holdsPanes(QApplication::activeWindow(), this) : PaneOf(focus) != nullptr;
@@ -227,10 +236,19 @@ void UXTPMDIFrameWnd::SettlePanes()
     }
 }
 
-void UXTPMDIFrameWnd::FollowKeyboard(const QWidget *now)
+void UXTPMDIFrameWnd::FollowKeyboard(const QWidget *before, const QWidget *now)
 {
     if (now != nullptr && holdsPanes(now->window(), this)) {
         keyboardWindow() = now->window();
+    }
+    // A window in which panes float as tabs gives the keyboard to its first widget, which is the row of tabs. One that the
+    // user has gone to with the Tab key keeps it.
+    const bool isNewWindow = now != nullptr && (before == nullptr || before->window() != now->window());
+    if (isNewWindow && now->window() != this && qobject_cast<const QTabBar *>(now) != nullptr &&
+        holdsPanes(now->window(), this))
+    {
+        tabsOfNewWindow_ = now;
+        SettleLater();
     }
     COneViewPane *pane = PaneOf(now);
     if (pane == nullptr || pane == activePane_) {

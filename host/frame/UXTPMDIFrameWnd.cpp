@@ -38,7 +38,7 @@ UXTPMDIFrameWnd::UXTPMDIFrameWnd(QWidget *parent) : QMainWindow(parent)
     auto *timer = new QTimer(this);
     connect(timer, &QTimer::timeout, this, &UXTPMDIFrameWnd::UpdateCommands);
     timer->start(updateInterval);
-    connect(qApp, &QApplication::focusChanged, this, [this](QWidget *, const QWidget *now) { FollowKeyboard(now); });
+    connect(qApp, &QApplication::focusChanged, this, &UXTPMDIFrameWnd::FollowKeyboard);
     connect(this, &QMainWindow::tabifiedDockWidgetActivated, this, [this](const QDockWidget *dock) {
         if (COneViewPane *pane = PaneOf(dock); pane != nullptr && pane->IsInFront()) {
             ActivatePane(*pane);

@@ -6,6 +6,7 @@
 
 #include <QHash>
 #include <QMainWindow>
+#include <QPointer>
 
 #include <vector>
 
@@ -79,11 +80,11 @@ private:
     void ForgetPane(const COneViewPane &pane);
     void SettleLater();
     void TakePane(COneViewPane &pane);
-    void FollowKeyboard(const QWidget *now);
+    void FollowKeyboard(const QWidget *before, const QWidget *now);
     void WatchTabs();
     void TabClicked(int index);
     COneViewPane *PaneOf(const QWidget *widget) const;
-    COneViewPane *PaneInFront() const;
+    COneViewPane *PaneInFront(const QWidget *window = nullptr) const;
     kareport::CommandTarget *PaneTarget() const;
     kareport::CommandTarget *ViewTarget() const;
 
@@ -92,5 +93,6 @@ private:
     COneViewPane *activePane_ = nullptr;
     std::vector<COneViewPane *> usedPanes_; ///< the one that was used last at the end
     bool willSettle_ = false;
+    QPointer<const QWidget> tabsOfNewWindow_; ///< that got the keyboard when their window became the active one
     QHash<unsigned, QAction *> actions_;
 };

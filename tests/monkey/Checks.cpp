@@ -208,7 +208,7 @@ QString World::checkWindows() const
             return QStringLiteral("nobody can see %1").arg(nameOf(*report));
         }
         if (report->GetTitle().endsWith(u" 2") && reports().size() == 1 && report->GetPathName().isEmpty() &&
-            closed_.empty() && before_.size() <= 1)
+            closed_.empty() && before_.empty())
         {
             return QStringLiteral("the only report has a number: %1").arg(nameOf(*report));
         }
