@@ -28,9 +28,9 @@ protected:
         return Desk::reports().back();
     }
 
-    void dragOut(const UReportDoc &report)
+    void dragOut(const UReportDoc &report, std::size_t view = 0)
     {
-        QDockWidget *dock = dockPaneOf(report).GetDock();
+        QDockWidget *dock = dockPaneOf(report, view).GetDock();
         const QPoint title(40, 8);
         const QPoint way(160, 190);
         QTest::mousePress(dock, Qt::LeftButton, Qt::NoModifier, title);
@@ -49,12 +49,15 @@ protected:
 
 TEST_F(FloatingPanes, HaveTheKeyboardInTheTextOfTheOneThatWasDragged)
 {
-    open("first.rep");
-    const UReportDoc *second = open("second.rep");
-    dragOut(*second);
+    folder.put("a.json", lineJob());
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.json")));
+    const UReportDoc *report = Desk::reports().back();
+    ASSERT_TRUE(desk.frame->OnCommand(kareport::windowNewCommand)) << "beside the hidden pane, as a tab";
+    settle();
+    dragOut(*report, 1);
     EXPECT_EQ(wrongWithActive(*desk.frame), QString());
-    EXPECT_EQ(desk.frame->GetCommandDocument(), second);
-    EXPECT_TRUE(editOf(*second).hasFocus());
+    EXPECT_EQ(desk.frame->GetActiveView(), report->GetViews().at(1));
+    EXPECT_TRUE(editOf(*report, 1).hasFocus());
 }
 
 TEST_F(FloatingPanes, WhatIsLeftInTheirWindowIsActiveWhenTheOneInFrontIsClosed)

@@ -71,9 +71,9 @@ QString panesOf(const DeskFrame &frame)
                               dock->isFloating()         ? QStringLiteral(", floats")
                               : dock->window() != &frame ? QStringLiteral(", floats with others")
                                                          : QString(),
-                              pane == nullptr       ? QStringLiteral(", left by its pane")
-                              : pane->IsInFront()   ? QStringLiteral(", in front")
-                                                    : QString(),
+                              pane == nullptr     ? QStringLiteral(", left by its pane")
+                              : pane->IsInFront() ? QStringLiteral(", in front")
+                                                  : QString(),
                               pane != nullptr && pane == active ? QStringLiteral(", active") : QString())
                          .arg(place.x())
                          .arg(place.y())
