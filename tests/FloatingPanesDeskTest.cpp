@@ -87,4 +87,26 @@ TEST_F(FloatingPanes, AReportWhoseFileIsOpenComesBeforeTheOtherTabs)
     }
 }
 
+TEST_F(FloatingPanes, DoNotComeBackAtTheNextStartWithoutTheirReports)
+{
+    open("first.rep");
+    dragOut(*open("second.rep"));
+    ASSERT_TRUE(desk.frame->close());
+    desk.frame.reset();
+    desk.application.reset();
+    desk.application.emplace();
+    desk.frame.emplace();
+    desk.frame->show();
+    settle();
+    for (const QObject *child : desk.frame->children()) {
+        EXPECT_FALSE(child->inherits("QDockWidgetGroupWindow"));
+    }
+    const UReportDoc *third = open("third.rep");
+    dragOut(*third);
+    dockPaneOf(*third).GetDock()->close();
+    settle();
+    EXPECT_TRUE(Desk::reports().empty());
+    desk.frame->repaint();
+}
+
 } // namespace

@@ -281,8 +281,8 @@ void DeskFrame::closeEvent(QCloseEvent *event)
             return;
         }
     }
-    saveLayout();
     UApplication::Get()->CloseAllDocuments();
+    saveLayout();
     event->accept();
 }
 

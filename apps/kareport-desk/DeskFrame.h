@@ -73,7 +73,8 @@ private:
     void dockAll(const std::function<void(QDockWidget *before, QDockWidget *dock)> &join);
     void about();
     void loadLayout();
-    void saveLayout() const;
+    /// Called when all reports are closed.
+    void saveLayout();
 
     std::vector<kareport::Command> commands_;
     QMenu *recentFiles_ = nullptr;

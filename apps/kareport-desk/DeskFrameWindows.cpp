@@ -18,6 +18,8 @@ namespace
 
 const QString layoutEntry = QStringLiteral("Window Layout");
 const QString geometryEntry = QStringLiteral("Window Geometry");
+/// Of what the layout holds. Those of version 0 held the panes as well.
+constexpr int layoutVersion = 1;
 
 /// The pane of the window that shows a report while it is written; null without one.
 CViewPane *reportWindowPane(const UDocument &document)
@@ -125,11 +127,21 @@ void DeskFrame::cascade()
 void DeskFrame::loadLayout()
 {
     restoreGeometry(QByteArray::fromBase64(GetProfileString(QString(), geometryEntry).toLatin1()));
-    restoreState(QByteArray::fromBase64(GetProfileString(QString(), layoutEntry).toLatin1()));
+    restoreState(QByteArray::fromBase64(GetProfileString(QString(), layoutEntry).toLatin1()), layoutVersion);
 }
 
-void DeskFrame::saveLayout() const
+void DeskFrame::saveLayout()
 {
+    // The panes go with the reports. Qt keeps places for panes that are not there at the next start, and the window of a row
+    // of tabs without tabs, and fails when others are dragged into them.
+    for (QDockWidget *dock : findChildren<QDockWidget *>()) {
+        dock->setParent(nullptr);
+    }
+    for (QWidget *window : findChildren<QWidget *>(QString(), Qt::FindDirectChildrenOnly)) {
+        if (window->inherits("QDockWidgetGroupWindow")) {
+            delete window; // it is empty, and would go a moment later
+        }
+    }
     WriteProfileString(QString(), geometryEntry, QString::fromLatin1(saveGeometry().toBase64()));
-    WriteProfileString(QString(), layoutEntry, QString::fromLatin1(saveState().toBase64()));
+    WriteProfileString(QString(), layoutEntry, QString::fromLatin1(saveState(layoutVersion).toBase64()));
 }

@@ -24,6 +24,13 @@ void limitFiles(qint64 bytes)
     ::setrlimit(RLIMIT_FSIZE, &limit);
 }
 
+qint64 fileLimit()
+{
+    rlimit limit{};
+    ::getrlimit(RLIMIT_FSIZE, &limit);
+    return limit.rlim_cur == limit.rlim_max ? -1 : static_cast<qint64>(limit.rlim_cur);
+}
+
 int endEditors(const QDir &folder)
 {
     int ended = 0;

@@ -5,6 +5,7 @@
 #include <QDir>
 #include <QProcess>
 #include <QProcessEnvironment>
+#include <QRegularExpression>
 #include <QTemporaryDir>
 
 #include <algorithm>
@@ -95,6 +96,7 @@ Outcome Supervisor::run(const Steps &steps)
             }
         }
         said = QString::fromUtf8(worker.readAll());
+        said.remove(QRegularExpression(QStringLiteral("This plugin does not support [^\n]*\n")));
         const QString done = readAll(folder.filePath(doneName));
         const QStringList lines = done.split(u'\n', Qt::SkipEmptyParts);
         outcome.step = static_cast<std::size_t>(lines.size());

@@ -122,6 +122,8 @@ private:
 [[noreturn]] void dieAtOnce();
 /// Lets files grow to so many bytes from now on; below 0 without end.
 void limitFiles(qint64 bytes);
+/// To what files may grow; below 0 without end.
+qint64 fileLimit();
 /// Ends the editors that this desk has started. @return their number
 int endEditors(const QDir &folder);
 
