@@ -9,6 +9,7 @@
 #include <array>
 #include <cstdint>
 #include <cstring>
+#include <utility>
 
 namespace kareport
 {
@@ -146,7 +147,9 @@ constexpr qsizetype pieceSize = 64 * 1024;
 
 bool ReportTextWriter::writeBytes(const char *bytes, std::size_t size)
 {
-    hasFailed_ = hasFailed_ || device_.write(bytes, static_cast<qint64>(size)) != static_cast<qint64>(size);
+    if (!std::exchange(hasFailed_, true)) { // also where the device throws: nobody knows how much of it was taken
+        hasFailed_ = device_.write(bytes, static_cast<qint64>(size)) != static_cast<qint64>(size);
+    }
     return !hasFailed_;
 }
 
@@ -155,11 +158,11 @@ bool ReportTextWriter::writePieces(Text text, bool last)
 {
     if (!hasBegun_) {
         hasBegun_ = true;
+        // What cannot be turned into bytes is as good as not written.
+        hasFailed_ = !doneWhileMemoryLasts([this] { bytes_.resize(ReportTextEncoder::bound(pieceSize)); });
         if (lineEnds_ == LineEnds::ReportFile) {
             writeBytes(reportFileMark, sizeof reportFileMark);
         }
-        // What cannot be turned into bytes is as good as not written.
-        hasFailed_ |= !doneWhileMemoryLasts([this] { bytes_.resize(ReportTextEncoder::bound(pieceSize)); });
     }
     isEmpty_ = isEmpty_ && text.isEmpty();
     if (hasFailed_) {

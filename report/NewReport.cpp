@@ -1,11 +1,29 @@
 #include "NewReport.h"
 
+#include "CViewPane.h"
 #include "MemoryLasts.h"
 #include "ReportEntry.h"
 #include "UReportDoc.h"
 
 namespace kareport
 {
+
+namespace
+{
+
+/// Closes a report that could not be made. A pane that was given stays, with the views of others in it.
+void discard(UReportDoc &report, CViewPane *given)
+{
+    const bool autoDelete = report.IsAutoDelete();
+    report.SetAutoDelete(false);
+    while (given != nullptr && CViewPane::IsOpen(given) && !report.GetViews().empty()) {
+        given->RemoveView(report.GetViews().front());
+    }
+    report.SetAutoDelete(autoDelete);
+    report.OnCloseDocument();
+}
+
+} // namespace
 
 UReportDoc *openNewReport(const NewReport &report, bool show, CViewPane *pane, unsigned style, const QRect *rect)
 {
@@ -24,7 +42,7 @@ UReportDoc *openNewReport(const NewReport &report, bool show, CViewPane *pane, u
         made->SetReportFileName(report.name);
     }
     if (made->HasLostText()) {
-        made->OnCloseDocument(); // its title or its page header could not be made
+        discard(*made, pane); // its title or its page header could not be made
         return nullptr;
     }
     made->SetHeaderFlag(report.headerFlag);

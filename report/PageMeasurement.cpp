@@ -120,6 +120,10 @@ FontExtents measureFont(const QString &face, unsigned points, int resolution)
     font.setFamilies({face.left(longestFaceName), QStringLiteral("DejaVu Sans Mono")});
     font.setStyleHint(QFont::TypeWriter);
     font.setFixedPitch(true);
+    // Whatever the application's own font is.
+    font.setWeight(QFont::Normal);
+    font.setItalic(false);
+    font.setStretch(QFont::Unstretched);
     font.setHintingPreference(QFont::PreferNoHinting);
     font.setPixelSize(mulDiv(static_cast<int>(points), resolution, pointsPerInch));
     const QFontMetricsF metrics(font);

@@ -50,7 +50,9 @@ void PageWriter::clear()
 
 bool PageWriter::emptyIntoOutlet()
 {
-    const bool isTaken = text_.isNarrow() ? outlet_->write(text_.narrowView()) : outlet_->write(text_.view());
+    bool isTaken = false;
+    losesNothing(
+        [&] { isTaken = text_.isNarrow() ? outlet_->write(text_.narrowView()) : outlet_->write(text_.view()); });
     text_.drain();
     starts_.clear();
     return isTaken;

@@ -13,6 +13,7 @@ namespace
 struct DeferredReport
 {
     UReportDoc *report;
+    int closeMode; ///< before the exit
     bool isAskedToClose;
 };
 
@@ -32,8 +33,11 @@ auto placeOf(const UReportDoc &report)
 
 void kareport::deferCloseForExit(UReportDoc &report)
 {
-    forgetExit(report);
-    deferredReports().push_back({&report, false});
+    if (const auto place = placeOf(report); place != deferredReports().end()) {
+        place->isAskedToClose = false; // the exit before was not taken back, and is not what the host has set
+    } else {
+        deferredReports().push_back({&report, report.GetCloseDocument(), false});
+    }
     report.SetCloseDocument(1);
 }
 
@@ -60,7 +64,7 @@ void kareport::noteExitCancelled()
         if (deferred.isAskedToClose) {
             deferred.report->CloseReportDocument();
         } else {
-            deferred.report->SetCloseDocument(0);
+            deferred.report->SetCloseDocument(deferred.closeMode);
         }
     }
 }

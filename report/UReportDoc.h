@@ -350,6 +350,8 @@ public:
     void CloseReportDocument();
     /// 0 closes normally, 1 defers closing, 2 closing has been asked for.
     void SetCloseDocument(int mode) { closeMode_ = mode; }
+    /// What `SetCloseDocument` was given last, 2 after `CloseReportDocument`; 0 at first.
+    int GetCloseDocument() const { return closeMode_; }
     void SetCloseDocumentFlag(bool on) { closeDocument_ = on; }
     bool GetCloseDocumentFlag() const { return closeDocument_; }
     /// 0 forbids closing the report's panes.
@@ -381,6 +383,8 @@ private:
     bool saveUnderChosenName(const QString &path, bool replace);
     void readLines(QIODevice &file, bool mayBeRichText, bool keepLineEnds);
     void sendText();
+    bool findPageStarts(qint64 from);
+    void takeUp(const QString &name, bool headerFlag, bool externalEditor);
     bool writeAsPdf(QIODevice &device, kareport::PdfNotes *notes,
                     const std::function<bool(qint64, qint64)> &progress) const;
     bool saveText(const QString &path);

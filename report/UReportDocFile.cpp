@@ -165,7 +165,7 @@ bool UReportDoc::EndTextStream(kareport::ReportTextWriter &writer)
     page_.setOutlet(&writer);
     const bool isTaken = page_.emptyIntoOutlet();
     page_.setOutlet(nullptr);
-    return isTaken && writer.finish() && !HasLostText();
+    return isTaken && !HasLostText() && kareport::whileMemoryLasts(false, [&] { return writer.finish(); });
 }
 
 bool UReportDoc::WritePdf(QIODevice &device, kareport::PdfNotes *notes,

@@ -18,14 +18,12 @@ using kareport::showsReport;
 namespace
 {
 
-/// Whether an open pane of another document has the title as its caption. No title is nobody's.
-bool isTaken(const QString &title, const UDocument &document)
+/// Whether a pane has the title as its caption. No title is nobody's.
+bool isTaken(const QString &title, const QStringList &captions)
 {
     if (title.isEmpty()) {
         return false;
     }
-    QStringList captions;
-    CViewPane::GetPaneCaptions(captions, &document);
     return std::any_of(captions.begin(), captions.end(),
                        [&title](const QString &caption) { return kareport::equalFolded(title, caption); });
 }
@@ -38,7 +36,9 @@ void UReportDoc::SetTitle(const QString &title)
         const QString given = title; // may be the very title that is numbered below
         title_ = given;
         SetHeader();
-        for (int number = 2; isTaken(title_, *this); ++number) {
+        QStringList captions;
+        CViewPane::GetPaneCaptions(captions, this);
+        for (int number = 2; isTaken(title_, captions); ++number) {
             title_ = given + u' ' + QString::number(number);
         }
         UDocument::SetTitle(title_);
@@ -100,7 +100,7 @@ bool UReportDoc::CanCloseFrame(CViewPane * /*pane*/)
             return true;
         }
     }
-    return SaveModified();
+    return kareport::whileMemoryLasts(false, [this] { return SaveModified(); });
 }
 
 bool UReportDoc::IsShown(const CViewPane *except) const

@@ -43,22 +43,30 @@ std::vector<qint64> UReportDoc::GetPageStartLines() const
 
 bool UReportDoc::FindPageStarts(qint64 from)
 {
-    return kareport::whileMemoryLasts(false, [&] {
-        if (from < 0 || from >= GetTextLength() || HoldsRichTextSource()) {
-            return false; // the lines of a source are not those that it shows
-        }
-        const kareport::ReportText &text = page_.text();
-        std::vector<qint64> found = text.isNarrow() ? kareport::pageHeadersIn(text.narrowView().sliced(from))
-                                                    : kareport::pageHeadersIn(text.view().sliced(from));
-        if (found.empty()) {
-            return false;
-        }
-        std::vector<qint64> starts = GetPageStarts();
-        starts.erase(std::lower_bound(starts.begin(), starts.end(), from), starts.end());
-        for (const qint64 header : found) {
-            starts.push_back(from + header);
-        }
-        SetPageStarts(std::move(starts));
-        return true;
-    });
+    bool areFound = false;
+    const bool isLooked = kareport::doneWhileMemoryLasts([&] { areFound = findPageStarts(from); });
+    if (!isLooked) {
+        page_.noteLostText(); // the text is whole, its pages are not
+    }
+    return areFound;
+}
+
+bool UReportDoc::findPageStarts(qint64 from)
+{
+    if (from < 0 || from >= GetTextLength() || HoldsRichTextSource()) {
+        return false; // the lines of a source are not those that it shows
+    }
+    const kareport::ReportText &text = page_.text();
+    std::vector<qint64> found = text.isNarrow() ? kareport::pageHeadersIn(text.narrowView().sliced(from))
+                                                : kareport::pageHeadersIn(text.view().sliced(from));
+    if (found.empty()) {
+        return false;
+    }
+    std::vector<qint64> starts = GetPageStarts();
+    starts.erase(std::lower_bound(starts.begin(), starts.end(), from), starts.end());
+    for (const qint64 header : found) {
+        starts.push_back(from + header);
+    }
+    SetPageStarts(std::move(starts));
+    return true;
 }

@@ -22,6 +22,11 @@ void UReportDoc::ShowReportBar(kareport::ReportWindow *window, bool show)
 
 void UReportDoc::UpdateReportInfo(const QString &name, bool headerFlag, bool externalEditor)
 {
+    page_.losesNothing([&] { takeUp(name, headerFlag, externalEditor); });
+}
+
+void UReportDoc::takeUp(const QString &name, bool headerFlag, bool externalEditor)
+{
     if (CViewPane *pane = GetFrameWindow()) {
         pane->ShowPane(false);
     }

@@ -1,5 +1,6 @@
 #include "ActivePaneFixture.h"
 #include "EditorFixture.h"
+#include "ReportExit.h"
 
 #include <QClipboard>
 
@@ -288,6 +289,20 @@ TEST_F(ActivePane, AnEditorThatHidesAPaneDoesNotKeepAReport)
     dockPaneOf(*report, 1).GetDock()->close();
     EXPECT_EQ(boxes.boxes.size(), 1U) << "the only pane that is left is not closed without a question";
     EXPECT_TRUE(UReportDoc::IsReportAvailable(report));
+}
+
+TEST_F(ActivePane, AnExitThatIsRefusedLeavesWhatTheHostHasDeferred)
+{
+    for (const int mode : {0, 1, 2}) {
+        UReportDoc *report = CreateReportWindow(QStringLiteral("Written %1").arg(mode), false, false);
+        report->SetCloseDocument(mode);
+        kareport::deferCloseForExit(*report);
+        EXPECT_EQ(report->GetCloseDocument(), 1);
+        kareport::deferCloseForExit(*report); // the user tries again
+        kareport::noteExitCancelled();
+        EXPECT_EQ(report->GetCloseDocument(), mode);
+        report->SetCloseDocument(0);
+    }
 }
 
 class RefusingFrame : public UXTPMDIFrameWnd

@@ -143,6 +143,23 @@ TEST(UReportDocClosing, DocumentsCloseWithTheirApplication)
     EXPECT_EQ(gone, 2) << "and their panes with them";
 }
 
+TEST(UReportDocClosing, AnOwnerIsToldOfAReportThatGoesWithTheApplicationWhileItsClosingIsDeferred)
+{
+    const FixedSurroundings surroundings;
+    QString log;
+    Owner owner(log);
+    UApplication application;
+    UDocTemplate *reports = application.AddDocTemplate(std::make_unique<UDocTemplate>(
+        1, [&] { return std::make_unique<WatchedReport>(log, &owner); }, nullptr, nullptr,
+        QStringLiteral("REPORTDOCTEMPLATE"), 1, 1));
+    auto *report = dynamic_cast<UReportDoc *>(reports->OpenReportDocumentFile(QString(), 0, 0, nullptr, 0, nullptr));
+    ASSERT_NE(report, nullptr);
+    report->SetReportWindow(new TestReportWindow);
+    report->SetCloseDocument(1);
+    reports->CloseAllDocuments();
+    EXPECT_EQ(log, QStringLiteral("closed told gone "));
+}
+
 TEST(UReportDocClosing, ATitleThatIsGivenAgainIsNumberedFromTheSameTitle)
 {
     const FixedSurroundings surroundings;

@@ -88,6 +88,15 @@ TEST(UReportView, FontIsTheReportsAndAlwaysFixedPitch)
     }
 }
 
+TEST(UReportView, AnExitWithoutAFrameDefersNoClosing)
+{
+    ShownReport shown;
+    UReportView &view = shown.open();
+    shown.report.SetReportWindow(new TestReportWindow);
+    view.OnReportExit();
+    EXPECT_EQ(shown.report.GetCloseDocument(), 0) << "nobody exits, and nobody would put it back later";
+}
+
 TEST(UReportView, AViewWithoutADocument)
 {
     UReportView view;

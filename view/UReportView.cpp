@@ -337,7 +337,7 @@ void UReportView::OnReportExit()
         kareport::deferCloseForExit(*report);
     }
     UXTPMDIFrameWnd *frame = UXTPMDIFrameWnd::Get();
-    if (frame != nullptr && !frame->close()) {
+    if (frame == nullptr || !frame->close()) {
         kareport::noteExitCancelled();
     }
 }

@@ -91,7 +91,7 @@ void setWindowCaption(const UReportDoc &report, const QString &caption)
 /// A report that is shown in a report window while it is written.
 UReportDoc *makeShown(bool header, const QString &caption)
 {
-    // The job gives the title; a title that is given twice would be numbered.
+    // The job gives the title.
     UReportDoc *report = CreateReportWindow(QString(), header, GetUsePreferredReportEditorFlag() != 0);
     if (report != nullptr) {
         setWindowCaption(*report, caption);

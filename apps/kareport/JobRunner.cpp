@@ -285,8 +285,7 @@ std::optional<InputError> JobRunner::prepare()
         return error;
     }
     applyOptions();
-    // A title is set once, when the page is known: its header line is built then, and set twice it would be numbered as
-    // if another report had it.
+    // A title is set when the page is known: its header line is built then.
     if (job_.title) {
         report_->SetTitle(*job_.title);
     } else if (!job_.reportTemplate) {

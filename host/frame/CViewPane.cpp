@@ -78,15 +78,13 @@ void CViewPane::ShowPane(bool show)
 
 void CViewPane::CountAgain()
 {
-    std::vector<UDocument *> documents;
-    for (const auto &view : views_) {
-        UDocument *document = view->GetDocument();
-        if (document != nullptr && std::find(documents.begin(), documents.end(), document) == documents.end()) {
-            documents.push_back(document);
+    for (auto view = views_.begin(); view != views_.end(); ++view) {
+        UDocument *document = (*view)->GetDocument();
+        const bool isCounted = std::any_of(
+            views_.begin(), view, [document](const auto &earlier) { return earlier->GetDocument() == document; });
+        if (document != nullptr && !isCounted) {
+            document->UpdateFrameCounts();
         }
-    }
-    for (UDocument *document : documents) {
-        document->UpdateFrameCounts();
     }
 }
 

@@ -5,6 +5,7 @@
 #include "UView.h"
 
 #include <algorithm>
+#include <new>
 
 namespace
 {
@@ -69,7 +70,7 @@ void UDocTemplate::CloseAllDocuments()
         // A document that defers its closing goes all the same.
         if (!documents_.empty() && documents_.back() == document) {
             document->CloseAllPanes();
-            delete document;
+            document->EndDocument();
         }
     }
 }
@@ -132,7 +133,12 @@ void UDocTemplate::ShowIn(CViewPane *pane, UDocument *document)
     if (view) {
         UView *shown = view.get();
         pane->AddView(std::move(view));
-        document->AddView(shown);
+        try {
+            document->AddView(shown);
+        } catch (const std::bad_alloc &) {
+            pane->RemoveView(shown); // a view without a document would stay in a pane that is given
+            throw;
+        }
     }
 }
 

@@ -50,8 +50,8 @@ void UDocument::SetPathName(const QString &path, bool addToRecentFiles)
 
 void UDocument::AddView(UView *view)
 {
-    view->document_ = this;
     views_.push_back(view);
+    view->document_ = this;
     UpdateFrameCounts();
 }
 
@@ -94,19 +94,26 @@ void UDocument::UpdateFrameCounts()
             pane->UpdateTitle();
         }
     }
-    std::vector<CViewPane *> panes;
+    // Nothing is collected: views count again when they go, where nothing may fail.
+    CViewPane *first = nullptr;
+    int count = 0;
     for (const UView *view : views_) {
         CViewPane *pane = visiblePane(view);
         if (pane != nullptr && pane->GetWindowNumber() == -1) {
-            panes.push_back(pane);
-            panes.back()->SetWindowNumber(static_cast<int>(panes.size()));
+            first = first != nullptr ? first : pane;
+            pane->SetWindowNumber(++count);
         }
     }
-    if (panes.size() == 1) {
-        panes.front()->SetWindowNumber(0);
+    if (count == 1) {
+        first->SetWindowNumber(0);
     }
-    for (CViewPane *pane : panes) {
-        pane->UpdateTitle();
+    for (auto view = views_.begin(); view != views_.end(); ++view) {
+        CViewPane *pane = visiblePane(*view);
+        const bool isUpdated = std::any_of(views_.begin(), view,
+                                           [pane](const UView *earlier) { return earlier->GetParentPane() == pane; });
+        if (pane != nullptr && !isUpdated) {
+            pane->UpdateTitle();
+        }
     }
 }
 
@@ -220,6 +227,11 @@ void UDocument::CloseAllPanes()
 void UDocument::OnCloseDocument()
 {
     CloseAllPanes();
+    EndDocument();
+}
+
+void UDocument::EndDocument()
+{
     OnDocumentEvent(DocumentEvent::AfterCloseDocument);
     DeleteContents();
     if (autoDelete_) {

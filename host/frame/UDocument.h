@@ -95,6 +95,8 @@ public:
 protected:
     /// Closes the panes of all views, without closing the document with the last of them.
     void CloseAllPanes();
+    /// Ends a document without views: tells of it, empties it, and deletes it where it deletes itself.
+    void EndDocument();
 
 private:
     friend class UDocTemplate;

@@ -1,6 +1,8 @@
 #include "ReportSubject.h"
 
 #include "FrameFixture.h"
+#include "ReportInitialTemplate.h"
+#include "ReportTextCodec.h"
 
 #include <cstdio>
 #include <iterator>
@@ -206,6 +208,31 @@ constexpr Operation operations[] = {
      [](auto &s, auto &a) { return s.report.OnSaveDocument(a.richTextPath); },
      {.hasView = true},
      true},
+    {"UpdateReportInfo",
+     Text::Written,
+     [](auto &s, auto &) {
+         s.report.UpdateReportInfo(QStringLiteral("another run of it, with a long name"), true, false);
+         return lostNothing(s);
+     },
+     {.hasView = true}},
+    {"CanCloseFrame", Text::Same,
+     [](auto &s, auto &) {
+         s.report.SetModifiedFlag(true);
+         return s.report.CanCloseFrame(nullptr);
+     }},
+    {"GetPages", Text::Same, [](auto &s, auto &) { return !s.report.GetPages().empty(); }},
+    {"GetPageStartLines", Text::Same,
+     [](auto &s, auto &) {
+         s.report.GetPageStartLines();
+         return true;
+     }},
+    {"Activate",
+     Text::Same,
+     [](auto &s, auto &) {
+         s.report.Activate(true);
+         return true;
+     },
+     {.hasView = true}},
     {"DoSave", Text::Same, [](auto &s, auto &a) { return s.report.DoSave(a.reportPath, false); }, {}, true},
     {"GetCurrentReportFileName", Text::Same,
      [](auto &s, auto &) { return !s.report.GetCurrentReportFileName().isEmpty(); }},
@@ -449,6 +476,99 @@ TEST(ReportAllocation, WithoutMemoryThereIsNoNewReport)
         return hasFailed && !testing::Test::HasFailure();
     });
     EXPECT_GT(allocations, 5);
+}
+
+TEST(ReportAllocation, AReportThatCannotBeMadeLeavesTheGivenPane)
+{
+    const Surroundings around;
+    UDocTemplate &reports = *around.application.reportTemplate();
+    UReportDoc *neighbour = CreateReport(QStringLiteral("neighbour"), false, false, nullptr, 0, nullptr);
+    ASSERT_NE(neighbour, nullptr);
+    auto *pane = new CountingPane;
+    showIn<TestReportView>(*pane, *neighbour);
+    failingEachAllocation([&](qint64 number) {
+        bool hasFailed = false;
+        UReportDoc *report = nullptr;
+        {
+            const FailingAllocation failing(number);
+            EXPECT_NO_THROW(report = CreateReport(QStringLiteral("a name of a report"), true, false, pane, 0, nullptr));
+            hasFailed = failing.hasFailed();
+        }
+        EXPECT_TRUE(CViewPane::IsOpen(pane)) << number;
+        EXPECT_TRUE(UReportDoc::IsReportAvailable(neighbour)) << number;
+        if (testing::Test::HasFailure()) {
+            return false;
+        }
+        EXPECT_EQ(pane->GetViews().front()->GetDocument(), neighbour) << number;
+        EXPECT_EQ(pane->GetViews().size(), report != nullptr ? 2U : 1U) << number;
+        if (report != nullptr) {
+            pane->RemoveView(report->GetViews().front());
+        }
+        EXPECT_EQ(reports.GetDocuments().size(), 1U) << number;
+        return hasFailed && !testing::Test::HasFailure();
+    });
+    neighbour->OnCloseDocument();
+}
+
+TEST(ReportAllocation, ClosingAReportInTwoPanesNeedsNoMemory)
+{
+    const Surroundings around;
+    UReportDoc *report = CreateReport(QStringLiteral("report"), false, false, nullptr, 0, nullptr);
+    ASSERT_NE(report, nullptr);
+    for (int i = 0; i < 2; ++i) {
+        auto *pane = new CountingPane;
+        showIn<TestReportView>(*pane, *report);
+        pane->ShowPane(true);
+    }
+    const FailingAllocation failing(1);
+    EXPECT_NO_THROW(report->OnCloseDocument());
+    EXPECT_FALSE(failing.hasFailed()) << "a view that goes has nobody to tell";
+    EXPECT_FALSE(UReportDoc::IsReportAvailable(report));
+}
+
+TEST(ReportAllocation, WithoutMemoryThereIsNoTemplateForReports)
+{
+    EXPECT_GT(failingEachAllocation([](qint64 number) {
+                  const FailingAllocation failing(number);
+                  std::unique_ptr<UDocTemplate> made;
+                  EXPECT_NO_THROW(made = ReportInitialTemplate()) << number;
+                  EXPECT_EQ(made == nullptr, failing.hasFailed()) << number;
+                  return failing.hasFailed() && !testing::Test::HasFailure();
+              }),
+              0);
+}
+
+TEST(ReportAllocation, AStreamThatIsNotWholeSaysSo)
+{
+    const Surroundings around;
+    const QString piece(1000, u'x');
+    QByteArray whole;
+    failingEachAllocation([&](qint64 number) {
+        ReportSubject subject({});
+        kareport::ReportTextWriter writer(subject.bytes, kareport::LineEnds::ReportFile);
+        subject.report.StreamText(&writer);
+        bool isTaken = false;
+        bool hasFailed = false;
+        {
+            const FailingAllocation failing(number);
+            EXPECT_NO_THROW({
+                for (int i = 0; i < 600; ++i) {
+                    subject.report.WriteLine(piece, 0, 1, 0);
+                }
+                subject.report.LineFeed(2);
+                isTaken = subject.report.EndTextStream(writer);
+            }) << number;
+            hasFailed = failing.hasFailed();
+        }
+        EXPECT_TRUE(isTaken || hasFailed) << number;
+        if (isTaken) {
+            EXPECT_FALSE(subject.report.HasLostText()) << number;
+            EXPECT_TRUE(whole.isEmpty() || whole == subject.bytes.data()) << number;
+            whole = subject.bytes.data();
+        }
+        return hasFailed && !testing::Test::HasFailure();
+    });
+    EXPECT_GT(whole.size(), 600000);
 }
 
 } // namespace

@@ -3,6 +3,7 @@
 #include "DataReport.h"
 #include "EditorFixture.h"
 #include "FailingAllocationPosix.h"
+#include "ReportWindowFixture.h"
 #include "TemporaryFolder.h"
 
 #include <QBuffer>
@@ -32,6 +33,7 @@ private:
 public:
     RecordedLaunches launches;
     const PreferredEditor editor;
+    const AnsweredBoxes boxes{MessageAnswer::No};
     const QString loadPath = folder_.at(QStringLiteral("a.rep"));
     const QString reportPath = folder_.at(QStringLiteral("s.rep"));
     const QString richTextPath = folder_.at(QStringLiteral("s.rtf"));
