@@ -70,9 +70,9 @@ const PdfCluster &PdfClusters::of(QStringView text)
     } else if (const auto known = composite_.find(QString::fromRawData(text.data(), text.size()));
                known != composite_.end())
     {
-        place = &*known;
+        place = &known->second;
     } else {
-        place = &*composite_.insert(text.toString(), -1);
+        place = &composite_.emplace(text.toString(), -1).first->second;
     }
     if (*place < 0) {
         *place = static_cast<int>(clusters_.size());

@@ -2,12 +2,12 @@
 
 #include "PdfFont.h"
 
-#include <QHash>
 #include <QString>
 
 #include <deque>
 #include <optional>
 #include <string>
+#include <unordered_map>
 #include <vector>
 
 namespace kareport
@@ -72,7 +72,7 @@ private:
     std::optional<PdfFace> failedFace_;
     std::deque<PdfCluster> clusters_;
     std::vector<int> single_; ///< places of the clusters that are one character of U+FFFF at most; below 0: none yet
-    QHash<QString, int> composite_; ///< places of the others
+    std::unordered_map<QString, int> composite_; ///< places of the others
 };
 
 } // namespace kareport

@@ -8,13 +8,12 @@
 #include "ReportPages.h"
 #include "Xlate.h"
 
-#include <QHash>
-
 #include <algorithm>
 #include <deque>
 #include <numeric>
 #include <span>
 #include <string>
+#include <unordered_map>
 
 namespace kareport
 {
@@ -172,11 +171,10 @@ private:
 
     void noteMissing(char32_t character)
     {
-        const auto known = missingAt_.constFind(character);
-        if (known != missingAt_.constEnd()) {
-            ++notes_.missing[*known].count;
+        const auto [known, isNew] = missingAt_.try_emplace(character, notes_.missing.size());
+        if (!isNew) {
+            ++notes_.missing[known->second].count;
         } else {
-            missingAt_.insert(character, notes_.missing.size());
             notes_.missing.push_back({character, 1, lineNumber_});
         }
     }
@@ -190,7 +188,7 @@ private:
     double fontSize_ = 0;
     qsizetype linesToFit_ = 1; ///< on a page
     qint64 cellsAcross_ = 0;
-    QHash<char32_t, std::size_t> missingAt_; ///< place among the notes
+    std::unordered_map<char32_t, std::size_t> missingAt_; ///< place among the notes
     qint64 lineNumber_ = 0;
     std::deque<QString> lines_; ///< of the page at hand, used again for every page
     std::vector<QStringView> pieces_;

@@ -49,8 +49,8 @@ void UReportDoc::Serialize(UArchive &archive)
         // As many bytes as the text has characters, which is the first half of it: what reads such archives counts on
         // that length.
         archive.Write(QByteArrayView(reinterpret_cast<const char *>(GetData()), GetText().size()));
-        if (GetText().size() != GetTextLength()) {
-            archive.Abandon(); // there is no memory for it in UTF-16
+        if (GetText().size() != GetTextLength() || HasLostText()) {
+            archive.Abandon(); // there is no memory for it in UTF-16, or there was none for all of it
         }
         return;
     }
@@ -65,8 +65,12 @@ void UReportDoc::Serialize(UArchive &archive)
     const bool headerFlag = GetHeaderFlag();
     SetHeaderFlag(false);
     isSerializing_ = true;
-    if (LoadFile(archive.GetFilePath(), true) == 0) {
-        archive.Abandon(); // it has gone meanwhile, or there is no memory for it
+    const bool isLoaded = LoadFile(archive.GetFilePath(), true) != 0;
+    if (!IsReportAvailable(this)) {
+        return; // a view or an editor that took the text has closed the report
+    }
+    if (!isLoaded) {
+        archive.Abandon(); // the file has gone meanwhile, or there is no memory for it
     }
     isSerializing_ = false;
     SetHeaderFlag(headerFlag);

@@ -90,6 +90,20 @@ TEST(CommandLineKinds, AnEmptyReportMakesNoPdf)
     EXPECT_EQ(PdfReadBack(folder.bytesOf("e.pdf")).pageCount(), 1);
 }
 
+TEST(CommandLineKinds, RichTextThatShowsNothingMakesNoPdf)
+{
+    const CommandLineFolder folder;
+    folder.put("e.pdf", "kept");
+    folder.put("e.json", R"({"header": false, "report": [{"line": "{\\rtf1\\ansi}"}]})");
+    folder.put("e.rtf", "{\\rtf1\\ansi}");
+    for (const char *arguments : {"render e.json -o e.pdf", "convert e.rtf e.pdf"}) {
+        const ProgramRun run = folder.run(arguments);
+        EXPECT_EQ(run.status, 2) << arguments << run.all().constData();
+        EXPECT_TRUE(run.err.contains("the report is empty")) << arguments << run.all().constData();
+        EXPECT_EQ(folder.bytesOf("e.pdf"), "kept") << arguments;
+    }
+}
+
 TEST(CommandLineKinds, AWideLineIsSaid)
 {
     const CommandLineFolder folder;

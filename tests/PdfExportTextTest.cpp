@@ -262,4 +262,19 @@ TEST(PdfExportText, TheSameReportGivesTheSameBytes)
     EXPECT_FALSE(first.contains("CreationDate"));
 }
 
+TEST(PdfExportText, TheFileSaysNothingOfItselfAndIsCompressed)
+{
+    const QByteArray bytes = pdfBytes(pdfLines(QStringLiteral("A é ∞ 測量\n")));
+    const QByteArray objects = PdfReadBack(bytes).objects();
+    for (const char *key : {"/Title", "/Author", "/Creator", "/Subject", "/Keywords", "/PageMode", "/PageLayout",
+                            "/Outlines", "/PageLabels", "/OpenAction", "/Lang", "/Metadata"})
+    {
+        EXPECT_FALSE(objects.contains(key)) << key;
+    }
+    // As it is written: the page, two faces and what maps their characters.
+    EXPECT_GE(bytes.count("/FlateDecode"), 5);
+    EXPECT_EQ(bytes.count("stream\n") + bytes.count("stream\r\n"), 2 * bytes.count("/FlateDecode"))
+        << "begin and end of every stream";
+}
+
 } // namespace

@@ -163,6 +163,18 @@ TEST(SaveAs, AFileIsOnlyReplacedWhenTheUserSaysSo)
     EXPECT_NE(folder.bytesOf("a.rep"), "earlier");
 }
 
+TEST(SaveAs, AFolderThatIsNotThereIsSaidAndAskedForAgain)
+{
+    const JobFolder folder;
+    SavingDesk desk;
+    const UReportDoc *report = newReport();
+    desk.typed = {folder.path("plan/a"), folder.path("b")};
+    EXPECT_TRUE(Desk::reports().front()->DoSave(QString(), true));
+    EXPECT_EQ(report->GetPathName(), folder.path("b.rep"));
+    ASSERT_EQ(desk.messages.size(), 1);
+    EXPECT_TRUE(desk.messages.front().contains(folder.path("plan"))) << desk.messages.front().toStdString();
+}
+
 TEST(SaveAs, APdfIsAnExport)
 {
     const JobFolder folder;
@@ -248,6 +260,8 @@ TEST(SaveAs, AFailedSaveSaysWhy)
         {"a.pdf", [](UReportDoc &report) { report.SetMargins(QMargins(20000, 1000, 20000, 1000)); },
          "margins leave no room", "no other folder would help"},
         {"a.pdf", [](UReportDoc &report) { report.Clear(); }, "the report is empty", "readers refuse an empty PDF"},
+        {"a.pdf", [](UReportDoc &report) { report.SetData(QStringLiteral("{\\rtf1\\ansi}")); }, "the report is empty",
+         "rich text that shows nothing"},
         {"gone/a.pdf", [](UReportDoc &) {}, "No such file or directory", "a folder that is not there"},
         {"gone/a.rep", [](UReportDoc &) {}, "No such file or directory", "for a report file as well"},
         {"gone/a.rtf", [](UReportDoc &) {}, "No such file or directory", "and for rich text"},

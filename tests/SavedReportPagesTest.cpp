@@ -1,11 +1,13 @@
 #include "DeskFixture.h"
 
 #include "PageHeader.h"
+#include "PdfReadBack.h"
 #include "ReportEdit.h"
 #include "ReportViewWidget.h"
 #include "SavedReports.h"
 #include "UReportView.h"
 
+#include <QBuffer>
 #include <QTextBlock>
 
 #include <gtest/gtest.h>
@@ -56,6 +58,27 @@ TEST(SavedReportPages, AReopenedReportHasThePagesThatItWasWrittenIn)
             EXPECT_EQ(widget->edit().textCursor().block().text(), header(3)) << name;
             ASSERT_TRUE(kareport::reloadSavedReport(*report)) << name;
         }
+    }
+}
+
+TEST(SavedReportPages, ThePdfOfAReopenedRichTextHasThem)
+{
+    const JobFolder files;
+    files.put("a.rtf", ("{\\rtf1\\ansi{\\fonttbl{\\f0 Courier;}}\\f0 " + savedLines().join(QStringLiteral("\\par\n")) +
+                        QStringLiteral("\\par}"))
+                           .toLatin1());
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    UReportDoc *report = kareport::openSavedReport(files.path("a.rtf"));
+    ASSERT_NE(report, nullptr);
+    report->FixPage(40, 80); // by counting, all lines would be on one page
+    QBuffer pdf;
+    pdf.open(QIODevice::WriteOnly);
+    ASSERT_TRUE(report->WritePdf(pdf));
+    const QStringList pages = PdfReadBack(pdf.data()).pages();
+    ASSERT_EQ(pages.size(), 3);
+    for (int page = 1; page <= 3; ++page) {
+        EXPECT_EQ(pages[page - 1].trimmed().section(u'\n', 0, 0).simplified(), header(page).simplified());
     }
 }
 

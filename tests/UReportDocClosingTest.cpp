@@ -1,4 +1,6 @@
+#include "FrameFixture.h"
 #include "ReportFixture.h"
+#include "TemporaryFolder.h"
 
 #include <gtest/gtest.h>
 
@@ -158,6 +160,25 @@ TEST(UReportDocClosing, AnOwnerIsToldOfAReportThatGoesWithTheApplicationWhileIts
     report->SetCloseDocument(1);
     reports->CloseAllDocuments();
     EXPECT_EQ(log, QStringLiteral("closed told gone "));
+}
+
+/// Closes the report when it is updated.
+class ClosingView : public UView
+{
+public:
+    void OnUpdate(UView *, long, void *) override { GetDocument()->OnCloseDocument(); }
+};
+
+TEST(UReportDocClosing, AViewMayCloseAReportThatIsBeingOpened)
+{
+    const FixedSurroundings surroundings;
+    const TemporaryFolder folder;
+    putFile(folder.at(QStringLiteral("a.rep")), "TALVEN\r\r\n");
+    QString log;
+    auto *report = new WatchedReport(log, nullptr);
+    showIn<ClosingView>(*new CViewPane, *report);
+    EXPECT_FALSE(report->OnOpenDocument(folder.at(QStringLiteral("a.rep"))));
+    EXPECT_EQ(log, QStringLiteral("closed gone "));
 }
 
 TEST(UReportDocClosing, ATitleThatIsGivenAgainIsNumberedFromTheSameTitle)

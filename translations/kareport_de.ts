@@ -1742,6 +1742,11 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
     </message>
     <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
+        <source>There is no folder "%1". Choose another one, or create it first.</source>
+        <translation>Der Ordner „%1“ ist nicht vorhanden. Wählen Sie einen anderen, oder legen Sie ihn zuerst an.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SaveAs.cpp"/>
         <source>There is a file "%1" already. Replace it?</source>
         <translation>Die Datei „%1“ gibt es schon. Ersetzen?</translation>
     </message>

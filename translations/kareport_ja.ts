@@ -1742,6 +1742,11 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
     </message>
     <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
+        <source>There is no folder "%1". Choose another one, or create it first.</source>
+        <translation>フォルダー「%1」がありません。別のフォルダーを選ぶか、先に作成してください。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SaveAs.cpp"/>
         <source>There is a file "%1" already. Replace it?</source>
         <translation>ファイル「%1」は既にあります。置き換えますか?</translation>
     </message>

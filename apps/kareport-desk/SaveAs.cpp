@@ -42,6 +42,18 @@ std::vector<FileKind> kindsOf(const QString &filter)
     return kinds;
 }
 
+/// Qt's dialog takes names in folders that are not there. @return false, having said so
+bool hasFolder(const QString &path, const SaveRequest &request)
+{
+    const QString folder = QFileInfo(path).absolutePath();
+    if ((request.flags & SaveRequest::pathMustExist) == 0 || QFileInfo(folder).isDir()) {
+        return true;
+    }
+    showMessage({Xlate("There is no folder \"%1\". Choose another one, or create it first.").arg(folder), QString(),
+                 MessageButtons::Ok, MessageIcon::Information});
+    return false;
+}
+
 bool mayReplace(const QString &path, const SaveRequest &request)
 {
     if ((request.flags & SaveRequest::overwritePrompt) == 0 || !QFileInfo::exists(path)) {
@@ -59,7 +71,7 @@ void exportPdf(const UReportDoc &report, const QString &path)
     bool isWritten = false;
     if (report.HasLostText()) {
         problem = Xlate("a part of the report was lost when memory ran out");
-    } else if (report.IsEmpty()) {
+    } else if (makesNoPage(report)) {
         problem = Xlate("the report is empty, and a PDF has one page at least");
     } else {
         const WaitCursor cursor;
@@ -107,7 +119,7 @@ std::optional<QString> askSavePath(QWidget *parent, const SaveRequest &request)
     while (dialog.exec() == QDialog::Accepted) {
         const qsizetype chosen = titles.indexOf(dialog.selectedNameFilter());
         const QString path = withEndingOf(dialog.selectedFiles().value(0), patterns.value(chosen), patterns);
-        if (mayReplace(path, request)) {
+        if (hasFolder(path, request) && mayReplace(path, request)) {
             return path;
         }
     }

@@ -2,6 +2,7 @@
 
 #include "Interrupt.h"
 #include "OutputWriter.h"
+#include "PdfFile.h"
 #include "Xlate.h"
 
 #include <algorithm>
@@ -47,7 +48,7 @@ ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, 
         if (isInterrupted()) {
             return stoppedBefore(output);
         }
-        if (output.kind == OutputKind::Pdf && report.IsEmpty()) {
+        if (output.kind == OutputKind::Pdf && makesNoPage(report)) {
             // The library makes a document without a page of it, which readers refuse.
             printError(Xlate("kareport: the report is empty, and a PDF has a page at least: \"%1\" was not written")
                            .arg(output.file));

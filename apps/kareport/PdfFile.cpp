@@ -1,5 +1,7 @@
 #include "PdfFile.h"
 
+#include "UReportDoc.h"
+
 #include <QByteArray>
 #include <QFile>
 #include <QFileInfo>
@@ -19,6 +21,11 @@ bool isPdfFile(const QString &path)
     QFile file(path);
     return isPdfName(path) ||
            (QFileInfo(path).isFile() && file.open(QIODevice::ReadOnly) && file.read(length) == firstBytes);
+}
+
+bool makesNoPage(const UReportDoc &report)
+{
+    return report.IsEmpty() || (report.HoldsRichTextSource() && report.GetPages().empty());
 }
 
 } // namespace kareport

@@ -135,7 +135,11 @@ bool UDocument::OnOpenDocument(const QString &path)
     DeleteContents();
     SetModifiedFlag(true); // until all of it has been read
     UArchive archive(file, UArchive::Mode::Loading, QFileInfo(path).absoluteFilePath());
+    const std::weak_ptr<const bool> life = life_;
     Serialize(archive);
+    if (life.expired()) {
+        return false; // what took the text has closed the document
+    }
     if (!archive.IsGood()) {
         DeleteContents();
         return false;

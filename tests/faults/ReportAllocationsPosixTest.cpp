@@ -3,6 +3,7 @@
 #include "FrameFixture.h"
 #include "ReportInitialTemplate.h"
 #include "ReportTextCodec.h"
+#include "UArchive.h"
 
 #include <cstdio>
 #include <iterator>
@@ -569,6 +570,23 @@ TEST(ReportAllocation, AStreamThatIsNotWholeSaysSo)
         return hasFailed && !testing::Test::HasFailure();
     });
     EXPECT_GT(whole.size(), 600000);
+}
+
+TEST(ReportAllocation, AReportThatHasLostTextIsNotStored)
+{
+    const Surroundings around;
+    ReportSubject subject({});
+    UArchive archive(subject.bytes, UArchive::Mode::Storing, QString());
+    subject.report.Serialize(archive);
+    EXPECT_TRUE(archive.IsGood());
+    {
+        const FailingAllocation failing(1);
+        subject.report.Write(blocks, 0);
+        ASSERT_TRUE(failing.hasFailed());
+    }
+    ASSERT_TRUE(subject.report.HasLostText());
+    subject.report.Serialize(archive);
+    EXPECT_FALSE(archive.IsGood());
 }
 
 } // namespace
