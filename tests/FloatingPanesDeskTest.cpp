@@ -2,7 +2,7 @@
 #include "DeskCommandIds.h"
 #include "DeskFixture.h"
 
-// Panes that float together: a row of tabs that was dragged out of the frame stands in a window of its own.
+// Panes that float together: in a frame that drags rows of tabs as one, such a row stands in a window of its own.
 
 namespace
 {
@@ -14,11 +14,27 @@ void settle()
     QCoreApplication::processEvents();
 }
 
+void drag(QDockWidget *dock, QPoint way)
+{
+    const QPoint title(40, 8);
+    QTest::mousePress(dock, Qt::LeftButton, Qt::NoModifier, title);
+    for (int part = 1; part <= 4; ++part) {
+        QTest::mouseMove(dock, title + way * part / 4);
+    }
+    QTest::mouseRelease(dock, Qt::LeftButton, Qt::NoModifier, title + way);
+    settle();
+    settle();
+}
+
 /// A desk with reports whose panes were dragged out of the frame by the title of the one in front.
 class FloatingPanes : public testing::Test
 {
 protected:
-    FloatingPanes() { desk.answer = MessageAnswer::No; }
+    FloatingPanes()
+    {
+        desk.answer = MessageAnswer::No;
+        desk.frame->setDockOptions(desk.frame->dockOptions() | QMainWindow::GroupedDragging);
+    }
 
     UReportDoc *open(const char *name)
     {
@@ -31,15 +47,7 @@ protected:
     void dragOut(const UReportDoc &report, std::size_t view = 0)
     {
         QDockWidget *dock = dockPaneOf(report, view).GetDock();
-        const QPoint title(40, 8);
-        const QPoint way(160, 190);
-        QTest::mousePress(dock, Qt::LeftButton, Qt::NoModifier, title);
-        for (int part = 1; part <= 4; ++part) {
-            QTest::mouseMove(dock, title + way * part / 4);
-        }
-        QTest::mouseRelease(dock, Qt::LeftButton, Qt::NoModifier, title + way);
-        settle();
-        settle();
+        drag(dock, QPoint(1500, 190)); // beyond the frame
         EXPECT_NE(dock->window(), desk.frame.operator->());
     }
 
@@ -96,6 +104,7 @@ TEST_F(FloatingPanes, DoNotComeBackAtTheNextStartWithoutTheirReports)
     desk.application.reset();
     desk.application.emplace();
     desk.frame.emplace();
+    desk.frame->setDockOptions(desk.frame->dockOptions() | QMainWindow::GroupedDragging);
     desk.frame->show();
     settle();
     for (const QObject *child : desk.frame->children()) {
@@ -107,6 +116,43 @@ TEST_F(FloatingPanes, DoNotComeBackAtTheNextStartWithoutTheirReports)
     settle();
     EXPECT_TRUE(Desk::reports().empty());
     desk.frame->repaint();
+}
+
+TEST(DraggedPanes, StandWhereTheyWereDroppedAtOnce)
+{
+    for (int x = -200; x <= 200; x += 100) {
+        for (int y = -200; y <= 200; y += 100) {
+            Desk desk;
+            desk.answer = MessageAnswer::No;
+            const JobFolder folder;
+            ASSERT_TRUE(desk.frame->OnCommand(kareport::fileNewCommand));
+            for (const char *name : {"a.json", "b.json", "c.json"}) {
+                folder.put(name, lineJob(name));
+                ASSERT_TRUE(desk.frame->OpenFile(folder.path(name)));
+            }
+            settle();
+            const auto windowOf = [](std::size_t job) {
+                return dynamic_cast<COneViewPane *>(Desk::reports().at(job)->GetReportWindow()->GetOwningPane())
+                    ->GetDock();
+            };
+            QDockWidget *dragged = windowOf(2);
+            drag(dragged, QPoint(x, y));
+            const bool floats = dragged->isFloating();
+            const QRect place = dragged->geometry();
+            QTest::qWait(20); // a step of an animation
+            EXPECT_EQ(dragged->isFloating(), floats);
+            EXPECT_EQ(dragged->geometry(), place) << x << ' ' << y;
+            windowOf(3)->close();
+            if (QApplication::activeWindow() == nullptr) {
+                desk.frame->activateWindow(); // as a window manager does
+            }
+            settle();
+            ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.json")));
+            ASSERT_TRUE(desk.frame->OnCommand(kareport::windowNewCommand));
+            settle();
+            EXPECT_EQ(wrongWithActive(*desk.frame), QString()) << x << ' ' << y;
+        }
+    }
 }
 
 } // namespace

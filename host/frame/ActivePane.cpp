@@ -241,12 +241,10 @@ void UXTPMDIFrameWnd::FollowKeyboard(const QWidget *before, const QWidget *now)
     if (now != nullptr && holdsPanes(now->window(), this)) {
         keyboardWindow() = now->window();
     }
-    // A window in which panes float as tabs gives the keyboard to its first widget, which is the row of tabs. One that the
-    // user has gone to with the Tab key keeps it.
+    // A window that becomes the active one gives the keyboard to its first widget, which may be a row of tabs. One that
+    // the user has gone to with the Tab key keeps it.
     const bool isNewWindow = now != nullptr && (before == nullptr || before->window() != now->window());
-    if (isNewWindow && now->window() != this && qobject_cast<const QTabBar *>(now) != nullptr &&
-        holdsPanes(now->window(), this))
-    {
+    if (isNewWindow && qobject_cast<const QTabBar *>(now) != nullptr && holdsPanes(now->window(), this)) {
         tabsOfNewWindow_ = now;
         SettleLater();
     }

@@ -31,8 +31,9 @@ constexpr int updateInterval = 200; // milliseconds
 UXTPMDIFrameWnd::UXTPMDIFrameWnd(QWidget *parent) : QMainWindow(parent)
 {
     theFrame() = this;
-    setDockNestingEnabled(true);
-    setDockOptions(dockOptions() | QMainWindow::AllowTabbedDocks | QMainWindow::GroupedDragging);
+    // Neither animated nor dragged as rows of tabs: when a dock widget goes while another one moves into its place, or is
+    // dropped on a window of tabs, Qt 6.4 lays out what has gone.
+    setDockOptions(QMainWindow::AllowNestedDocks | QMainWindow::AllowTabbedDocks);
     setTabPosition(Qt::AllDockWidgetAreas, QTabWidget::North);
     new kareport::PlainTabTips(*this);
     auto *timer = new QTimer(this);

@@ -238,9 +238,14 @@ QString World::checkActive() const
         return QStringLiteral("the view with the keyboard is not the active one");
     }
     const QWidget *focus = QApplication::focusWidget();
-    if (dock != nullptr && focus != nullptr && !dock->isAncestorOf(focus)) {
-        return QStringLiteral("the keyboard is with a %1, not in the active pane")
-            .arg(QLatin1String(focus->metaObject()->className()));
+    const QList<QDockWidget *> docks = frame_->findChildren<QDockWidget *>();
+    const bool hasPanes = std::any_of(docks.begin(), docks.end(), [](const QDockWidget *shownDock) {
+        const auto *paneDock = dynamic_cast<const kareport::PaneDock *>(shownDock);
+        return paneDock != nullptr && paneDock->pane() != nullptr && paneDock->pane()->IsInFront() &&
+               paneDock->window() == QApplication::activeWindow();
+    });
+    if (hasPanes && (dock == nullptr || focus == nullptr || !dock->isAncestorOf(focus))) {
+        return QStringLiteral("the keyboard is not in the active pane");
     }
     if (typedInto != nullptr && frame_->GetCommandDocument() != typedInto->GetDocument()) {
         return QStringLiteral("commands are not for the report that has the keyboard");

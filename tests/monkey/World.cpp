@@ -235,6 +235,9 @@ void World::run(const Step &step)
         action->run(*this, chance);
     }
     settle();
+    if (QApplication::activeWindow() == nullptr && frame_->isVisible()) {
+        frame_->activateWindow(); // as a window manager does when the active window goes
+    }
     settle();
     given_ = answers_.take();
     // A file that is saved in the same millisecond as the one before would look as it did.
