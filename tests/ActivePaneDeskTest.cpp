@@ -157,4 +157,21 @@ TEST(ActivePaneDesk, AReportComesBackWhenItsEditorIsClosed)
     }
 }
 
+TEST(ActivePaneDesk, TheTabKeyDoesNotLeadToARowWithoutTabs)
+{
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    const JobFolder folder;
+    runJob(desk, folder, "a.json", "First line");
+    runJob(desk, folder, "b.json", "First line");
+    settle();
+    for (int press = 1; press <= 4; ++press) {
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Tab);
+        settle();
+        const auto *tabs = qobject_cast<const QTabBar *>(QApplication::focusWidget());
+        EXPECT_EQ(tabs, nullptr) << "after " << press << ": its tabs are " << (tabs != nullptr ? tabs->count() : 0);
+    }
+    EXPECT_EQ(wrongWithActive(*desk.frame), QString());
+}
+
 } // namespace

@@ -225,9 +225,10 @@ void UXTPMDIFrameWnd::SettlePanes()
             return;
         }
     }
-    // The keyboard is in a pane that nobody sees, or was in one that has gone; a menu or a bar may have it.
-    const bool isLost =
-        focus == nullptr ? hasLostWindow() || holdsPanes(QApplication::activeWindow(), this) : PaneOf(focus) != nullptr;
+    // The keyboard is in a pane or a row of tabs that nobody sees, or was in one that has gone; a menu or a bar may have it.
+    const bool isInTabs = qobject_cast<const QTabBar *>(focus) != nullptr && focus->focusPolicy() == Qt::NoFocus;
+    const bool isLost = focus == nullptr ? hasLostWindow() || holdsPanes(QApplication::activeWindow(), this)
+                                         : PaneOf(focus) != nullptr || isInTabs;
     COneViewPane *next = activePane_ != nullptr ? activePane_ : PaneInFront();
     if (next != nullptr && (isLost || activePane_ == nullptr)) {
         ActivatePane(*next);
@@ -261,9 +262,11 @@ void UXTPMDIFrameWnd::FollowKeyboard(const QWidget *before, const QWidget *now)
 
 void UXTPMDIFrameWnd::WatchTabs()
 {
-    for (const QTabBar *tabs : findChildren<QTabBar *>()) {
+    for (QTabBar *tabs : findChildren<QTabBar *>()) {
         if (holdsPanes(tabs->parentWidget(), this)) {
             connect(tabs, &QTabBar::tabBarClicked, this, &UXTPMDIFrameWnd::TabClicked, Qt::UniqueConnection);
+            // Qt keeps rows without tabs out of sight, where the Tab key would lead to them.
+            tabs->setFocusPolicy(tabs->count() > 1 ? Qt::TabFocus : Qt::NoFocus);
         }
     }
 }

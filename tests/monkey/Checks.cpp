@@ -15,6 +15,7 @@
 #include <QFile>
 #include <QFileInfo>
 #include <QMessageBox>
+#include <QTabBar>
 #include <QTextDocument>
 
 #include <algorithm>
@@ -244,7 +245,9 @@ QString World::checkActive() const
         return paneDock != nullptr && paneDock->pane() != nullptr && paneDock->pane()->IsInFront() &&
                paneDock->window() == QApplication::activeWindow();
     });
-    if (hasPanes && (dock == nullptr || focus == nullptr || !dock->isAncestorOf(focus))) {
+    const auto *tabs = qobject_cast<const QTabBar *>(focus);
+    const bool isInTabs = mayBeInTabs_ && tabs != nullptr && tabs->count() > 1 && !tabs->visibleRegion().isEmpty();
+    if (hasPanes && !isInTabs && (dock == nullptr || focus == nullptr || !dock->isAncestorOf(focus))) {
         return QStringLiteral("the keyboard is not in the active pane");
     }
     if (typedInto != nullptr && frame_->GetCommandDocument() != typedInto->GetDocument()) {

@@ -18,6 +18,7 @@
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonObject>
+#include <QTabBar>
 #include <QTest>
 #include <QTimer>
 
@@ -231,6 +232,7 @@ void World::run(const Step &step)
     Chance chance(step.seed);
     answers_.begin(Chance(step.seed ^ 0x5EED));
     const Action *action = actionOf(step.action.toLatin1().constData());
+    mayBeInTabs_ = step.action == u"key" || qobject_cast<QTabBar *>(QApplication::focusWidget()) != nullptr;
     if (action != nullptr) {
         action->run(*this, chance);
     }

@@ -116,6 +116,7 @@ private:
     QHash<QString, Stamp> filesBefore_;
     std::vector<Answer> given_;
     quint64 steps_ = 0;
+    bool mayBeInTabs_ = false; ///< the keyboard, which the Tab key leads to the rows of tabs
 };
 
 /// What differs from system to system.
