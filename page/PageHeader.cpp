@@ -111,6 +111,18 @@ std::vector<qint64> findHeaders(View text)
     return headers;
 }
 
+/// From one line to the next what most have: single pages may have been edited.
+std::optional<int> usualDistance(const std::vector<qint64> &lines)
+{
+    std::map<qint64, int> pages;
+    for (std::size_t i = 1; i < lines.size(); ++i) {
+        ++pages[lines[i] - lines[i - 1]];
+    }
+    const auto most =
+        std::max_element(pages.begin(), pages.end(), [](const auto &a, const auto &b) { return a.second < b.second; });
+    return most == pages.end() ? std::nullopt : std::optional<int>(static_cast<int>(most->first));
+}
+
 } // namespace
 
 QString pageHeaderDate(const QDateTime &time)
@@ -147,15 +159,17 @@ std::vector<qint64> pageHeadersIn(QLatin1StringView text)
 
 std::optional<int> linesBetweenPageHeaders(QStringView text)
 {
-    // What most pages have: single pages may have been edited.
-    const std::vector<qint64> lines = linesOfStarts(text, pageHeadersIn(text));
-    std::map<qint64, int> pages;
-    for (std::size_t i = 1; i < lines.size(); ++i) {
-        ++pages[lines[i] - lines[i - 1]];
-    }
-    const auto most =
-        std::max_element(pages.begin(), pages.end(), [](const auto &a, const auto &b) { return a.second < b.second; });
-    return most == pages.end() ? std::nullopt : std::optional<int>(static_cast<int>(most->first));
+    return linesBetweenPageHeaders(text, pageHeadersIn(text));
+}
+
+std::optional<int> linesBetweenPageHeaders(QStringView text, const std::vector<qint64> &headers)
+{
+    return usualDistance(linesOfStarts(text, headers));
+}
+
+std::optional<int> linesBetweenPageHeaders(QLatin1StringView text, const std::vector<qint64> &headers)
+{
+    return usualDistance(linesOfStarts(text, headers));
 }
 
 } // namespace kareport

@@ -33,5 +33,8 @@ KAREPORT_EXPORT std::vector<qint64> pageHeadersIn(QLatin1StringView text);
 /// The lines of a page of a report, as its header lines tell: the number of lines that stands most often from one of them
 /// to the next. Nothing for a text with fewer than two.
 KAREPORT_EXPORT std::optional<int> linesBetweenPageHeaders(QStringView text);
+/// The same where the header lines are known. @param headers  as `pageHeadersIn` gives them
+KAREPORT_EXPORT std::optional<int> linesBetweenPageHeaders(QStringView text, const std::vector<qint64> &headers);
+KAREPORT_EXPORT std::optional<int> linesBetweenPageHeaders(QLatin1StringView text, const std::vector<qint64> &headers);
 
 } // namespace kareport

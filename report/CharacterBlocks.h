@@ -8,6 +8,7 @@
 #include <cstring>
 #include <functional>
 #include <type_traits>
+#include <utility>
 
 namespace kareport
 {
@@ -33,6 +34,16 @@ public:
     ~CharacterBlocks() { std::free(data_); }
     CharacterBlocks(const CharacterBlocks &) = delete;
     CharacterBlocks &operator=(const CharacterBlocks &) = delete;
+
+    void swap(CharacterBlocks &other) noexcept
+    {
+        std::swap(reallocate_, other.reallocate_);
+        std::swap(data_, other.data_);
+        std::swap(size_, other.size_);
+        std::swap(gapAt_, other.gapAt_);
+        std::swap(usable_, other.usable_);
+        std::swap(allocated_, other.allocated_);
+    }
 
     /// All characters in one piece; null before the first successful `reserve`.
     Character *data() const

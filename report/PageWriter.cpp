@@ -128,6 +128,14 @@ void PageWriter::lineFeed(qint64 count)
     }
 }
 
+void PageWriter::exchangeText(ReportText &text, std::vector<qint64> pageStarts, qint64 lineEnds)
+{
+    text_.swap(text);
+    starts_.assign(std::move(pageStarts));
+    lineNumber_ += static_cast<int>(lineEnds);
+    lineCount_ += lineEnds;
+}
+
 bool PageWriter::replace(qint64 at, qint64 removed, QStringView inserted)
 {
     if (at < 0 || removed < 0 || at > text_.size() || removed > text_.size() - at) {

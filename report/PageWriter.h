@@ -61,6 +61,8 @@ public:
     /// Where each page begins. A text that is handed on has no record: nobody can look at its pages.
     const PageStarts &pageStarts() const { return starts_; }
     void setPageStarts(std::vector<qint64> starts) { starts_.assign(std::move(starts)); }
+    /// Takes a text in the place of this one, which is handed back. @param lineEnds  counted as if they had been written
+    void exchangeText(ReportText &text, std::vector<qint64> pageStarts, qint64 lineEnds);
     /// Replaces a piece of the text and carries the page starts along.
     /// @return false, changing nothing, for a piece that is not in the text or when there is no memory
     bool replace(qint64 at, qint64 removed, QStringView inserted);

@@ -82,6 +82,14 @@ bool ReportText::widen() const
     return true;
 }
 
+void ReportText::swap(ReportText &other) noexcept
+{
+    narrow_.swap(other.narrow_);
+    wide_.swap(other.wide_);
+    std::swap(isNarrow_, other.isNarrow_);
+    std::swap(pending_, other.pending_);
+}
+
 bool ReportText::owns(QStringView text) const
 {
     return !isNarrow_ && wide_.holds(text.utf16());

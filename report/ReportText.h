@@ -70,6 +70,8 @@ public:
     bool replace(qint64 at, qint64 removed, QStringView inserted);
     /// A copy of a piece of the text, in a time that does not grow with the text. Empty for a piece that is not in it.
     QString piece(qint64 at, qint64 length) const;
+    /// Exchanges two texts, however long they are.
+    void swap(ReportText &other) noexcept;
     /// Empties the text and goes back to one block.
     void clear();
     /// Empties the text and keeps its memory, for what is written next.

@@ -29,6 +29,7 @@ namespace kareport
 {
 class ReportWindow;
 struct FormatOptions;
+struct LoadedText;
 struct PdfNotes;
 } // namespace kareport
 
@@ -77,6 +78,10 @@ public:
     /// Replaces the text as it is. Counters stay, so what is written next continues the old pages. Where its pages begin is
     /// found by its page headers. Without memory for it the text is empty, and lost.
     void SetData(const QString &text);
+    /// Takes over a text that was made elsewhere, as on another thread, in a time that does not grow with it. Its lines are
+    /// counted as if they had been written, and its pages begin where it says. Neither rich text nor a report window is told
+    /// of it. @param text  is handed the text before it
+    void TakeText(kareport::LoadedText &text);
     /// Replaces a piece of the text as it is, in a time that does not grow with the text. Counters stay; pages begin where
     /// they did before.
     /// @param at  the first character replaced, from 0

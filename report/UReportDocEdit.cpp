@@ -1,8 +1,17 @@
 #include "UReportDoc.h"
 
+#include "LoadedText.h"
 #include "MemoryLasts.h"
 
 #include <algorithm>
+#include <utility>
+
+void UReportDoc::TakeText(kareport::LoadedText &text)
+{
+    ++editCount_;
+    page_.exchangeText(text.text, std::move(text.pageStarts), text.lineEnds);
+    SetModifiedFlag(true);
+}
 
 bool UReportDoc::ReplaceText(qint64 at, qint64 removed, QStringView inserted)
 {

@@ -276,4 +276,23 @@ TEST(ReportText, ClearingWorksWithoutAnyMemory)
     EXPECT_TRUE(text.view() == pattern(32000));
 }
 
+TEST(ReportText, TextsOfEveryKindAreExchanged)
+{
+    ReportText narrow;
+    ASSERT_TRUE(narrow.append(u"one byte a character"));
+    ASSERT_TRUE(narrow.replace(3, 1, u"-")); // not carried out yet
+    ReportText wide;
+    ASSERT_TRUE(wide.append(pattern(70'000)));
+    const char16_t *place = wide.data();
+    narrow.swap(wide);
+    EXPECT_EQ(narrow.data(), place) << "nothing was copied";
+    EXPECT_TRUE(narrow.view() == pattern(70'000));
+    EXPECT_TRUE(wide.isNarrow());
+    EXPECT_EQ(wide.piece(0, wide.size()), QStringLiteral("one-byte a character"));
+    ASSERT_TRUE(narrow.append(u"x"));
+    ASSERT_TRUE(wide.append(u"y"));
+    EXPECT_EQ(narrow.size(), 70'001);
+    EXPECT_TRUE(wide.view().endsWith(u"charactery"));
+}
+
 } // namespace

@@ -1,5 +1,6 @@
 #include "ReportFixture.h"
 
+#include "LoadedText.h"
 #include "Preferences.h"
 
 #include <gtest/gtest.h>
@@ -268,6 +269,25 @@ TEST(UReportDocText, FixedFiguresOutliveAMeasurement)
     report.NewPage(0);
     report.LineFeed(49);
     EXPECT_TRUE(report.NewPage(0)) << "the page rule counts with the fixed figure";
+}
+
+TEST(UReportDocText, ATextThatWasMadeElsewhereIsTakenOver)
+{
+    TextReport t;
+    t.report.WriteLine(QStringLiteral("before"), 0, 1, 0);
+    const int lines = t.report.GetLineCount();
+    const quint64 edits = t.report.GetEditCount();
+    t.report.SetModifiedFlag(false);
+    kareport::LoadedText loaded;
+    ASSERT_EQ(kareport::loadReportText("a\nb\nc", loaded), kareport::TextLoading::Whole);
+    loaded.pageStarts = {0, 3};
+    t.report.TakeText(loaded);
+    EXPECT_EQ(textOf(t.report), QStringLiteral("a\r\nb\r\nc"));
+    EXPECT_EQ(t.report.GetPageStarts(), (std::vector<qint64>{0, 3}));
+    EXPECT_EQ(t.report.GetLineCount(), lines + 2);
+    EXPECT_GT(t.report.GetEditCount(), edits) << "views are to load it";
+    EXPECT_TRUE(t.report.IsModified());
+    EXPECT_EQ(loaded.text.view().toString(), QStringLiteral("before\r\n"));
 }
 
 } // namespace
