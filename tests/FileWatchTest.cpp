@@ -90,4 +90,24 @@ TEST(FileWatch, AFileThatGoesAndComesBackIsToldWhenItIsBack)
     EXPECT_TRUE(t.waitFor(1));
 }
 
+TEST(FileWatch, AChangeBetweenTheReadingAndTheWatchIsTold)
+{
+    Watched t;
+    t.folder.put("b", "1");
+    t.folder.put("c", "1");
+    t.folder.put("d", "1");
+    t.watch.expect(t.folder.path("b"));
+    t.watch.expect(t.folder.path("c"));
+    t.watch.expect(t.folder.path("d"));
+    t.watch.expect(QString());
+    t.folder.put("b", "12");
+    t.folder.put("d", "12");
+    t.watch.ceaseToExpect(t.folder.path("d"));
+    for (const char *name : {"b", "c", "d"}) {
+        t.watch.watch(t.folder.path(name));
+    }
+    EXPECT_TRUE(t.waitFor(1));
+    EXPECT_EQ(t.settled(), QStringList(QStringLiteral("b"))) << "the others are as they were when they were read";
+}
+
 } // namespace

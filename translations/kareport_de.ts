@@ -1497,6 +1497,20 @@
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
+        <source>These reports could not be opened again:
+
+%1</source>
+        <translation>Diese Berichte konnten nicht wieder geöffnet werden:
+
+%1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
+        <source>Their changes that were not saved are kept, and are offered again at the next start.</source>
+        <translation>Ihre nicht gespeicherten Änderungen sind aufbewahrt und werden beim nächsten Start wieder angeboten.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>KaReport did not end properly, and what it had open cannot be read. These folders are left as they are:
 
 %1</source>
@@ -1521,15 +1535,6 @@ Open them again?</source>
 %1
 
 Sollen sie wieder geöffnet werden?</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>These reports could not be opened again:
-
-%1</source>
-        <translation>Diese Berichte konnten nicht wieder geöffnet werden:
-
-%1</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>

@@ -1497,6 +1497,20 @@
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
+        <source>These reports could not be opened again:
+
+%1</source>
+        <translation>次の帳票を開き直せませんでした:
+
+%1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
+        <source>Their changes that were not saved are kept, and are offered again at the next start.</source>
+        <translation>保存されていない変更は残してあり、次回の起動時に再び確認します。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>KaReport did not end properly, and what it had open cannot be read. These folders are left as they are:
 
 %1</source>
@@ -1521,15 +1535,6 @@ Open them again?</source>
 %1
 
 もう一度開きますか?</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>These reports could not be opened again:
-
-%1</source>
-        <translation>次の帳票を開き直せませんでした:
-
-%1</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>

@@ -5,6 +5,7 @@
 #include "Profile.h"
 #include "ReportEntry.h"
 #include "UReportView.h"
+#include "WorkAside.h"
 
 #include <QFileInfo>
 
@@ -33,6 +34,11 @@ DeskApplication::DeskApplication()
     for (const QString &file : files) {
         UApplication::AddToRecentFileList(file);
     }
+}
+
+DeskApplication::~DeskApplication()
+{
+    kareport::waitForStoppedWork();
 }
 
 void DeskApplication::AddToRecentFileList(const QString &path)

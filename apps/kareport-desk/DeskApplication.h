@@ -7,6 +7,7 @@ class DeskApplication : public UApplication
 {
 public:
     DeskApplication();
+    ~DeskApplication() override;
 
     void AddToRecentFileList(const QString &path) override;
     void OnDocumentEvent(UDocument &document, UDocument::DocumentEvent event) override;

@@ -13,6 +13,7 @@
 #include "UApplication.h"
 #include "UReportDoc.h"
 #include "UView.h"
+#include "WorkAside.h"
 #include "Xlate.h"
 
 #include <QCloseEvent>
@@ -156,13 +157,64 @@ bool DeskFrame::OpenFile(const QString &path)
         }
     } else {
         const QString file = QDir::cleanPath(QFileInfo(path).absoluteFilePath());
-        report = documentOf(file);
-        if (report == nullptr) {
-            report = kareport::openSavedReport(file);
+        if (reading_.contains(file)) {
+            return true;
         }
-        error = report == nullptr ? Xlate("\"%1\" could not be opened.").arg(path) : QString();
+        bool isStopped = false;
+        report = openReport(file, isStopped);
+        error = report == nullptr && !isStopped ? Xlate("\"%1\" could not be opened.").arg(path) : QString();
     }
     return finishOpening(report, error);
+}
+
+UDocument *DeskFrame::openReport(const QString &file, bool &isStopped)
+{
+    if (UDocument *open = documentOf(file)) {
+        return open;
+    }
+    return read(file, [&] { return kareport::openSavedReport(file, &isStopped); });
+}
+
+UReportDoc *DeskFrame::read(const QString &file, const std::function<UReportDoc *()> &open)
+{
+    reading_.append(file);
+    files_.expect(file);
+    UReportDoc *report = open();
+    reading_.removeOne(file);
+    if (report == nullptr) {
+        files_.ceaseToExpect(file);
+    }
+    return report;
+}
+
+std::vector<kareport::KeptReport> DeskFrame::reopen(const std::vector<kareport::KeptReport> &left)
+{
+    std::vector<kareport::KeptReport> notReopened;
+    QStringList lost;
+    bool isTextKept = false;
+    bool isStopped = false;
+    for (const kareport::KeptReport &kept : left) {
+        const auto open = [&] { return kareport::Recovery::reopen(kept, &isStopped); };
+        UReportDoc *report = isStopped ? nullptr : read(kept.path, open);
+        if (report != nullptr) {
+            activate(report);
+            continue;
+        }
+        notReopened.push_back(kept);
+        if (!isStopped) {
+            lost.append(kept.name());
+            isTextKept = isTextKept || kareport::Recovery::holdsText(kept);
+        }
+    }
+    if (!lost.isEmpty()) {
+        QString text = Xlate("These reports could not be opened again:\n\n%1").arg(lost.join(u'\n'));
+        if (isTextKept) {
+            text += QStringLiteral("\n\n") +
+                    Xlate("Their changes that were not saved are kept, and are offered again at the next start.");
+        }
+        kareport::showMessage({text, QString(), MessageButtons::Ok, kareport::MessageIcon::Information});
+    }
+    return notReopened;
 }
 
 void DeskFrame::OfferLeftReports()
@@ -189,20 +241,8 @@ void DeskFrame::OfferLeftReports()
         if (answer == MessageAnswer::Cancel) {
             return; // they are offered again at the next start
         }
-        QStringList lost;
-        for (const kareport::KeptReport &kept : left) {
-            if (answer == MessageAnswer::Yes) {
-                if (UReportDoc *report = kareport::Recovery::reopen(kept)) {
-                    activate(report);
-                } else {
-                    lost.append(kept.name());
-                    notReopened.push_back(kept);
-                }
-            }
-        }
-        if (!lost.isEmpty()) {
-            kareport::showMessage({Xlate("These reports could not be opened again:\n\n%1").arg(lost.join(u'\n')),
-                                   QString(), MessageButtons::Ok, kareport::MessageIcon::Information});
+        if (answer == MessageAnswer::Yes) {
+            notReopened = reopen(left);
         }
         if (!recovery_.keep()) {
             return; // a full disk: what was left stays where it is
@@ -226,10 +266,14 @@ void DeskFrame::NoteDocumentEvent(UDocument &document, UDocument::DocumentEvent 
                 paths.append(open->GetPathName());
             }
             files_.retain(paths);
-            const bool isClosed = event == UDocument::DocumentEvent::AfterCloseDocument;
-            if (!isClosed && isOpen(&document) && !document.GetPathName().isEmpty() &&
-                !kareport::isPdfName(document.GetPathName())) {
-                files_.watch(document.GetPathName());
+            if (event == UDocument::DocumentEvent::AfterCloseDocument || !isOpen(&document)) {
+                return;
+            }
+            const QString path = document.GetPathName();
+            // Only what is saved here is as it was left: a file that was read may have changed since.
+            const bool isNew = event == UDocument::DocumentEvent::AfterSaveDocument || !files_.isWatched(path);
+            if (isNew && !path.isEmpty() && !kareport::isPdfName(path)) {
+                files_.watch(path);
             }
         },
         Qt::QueuedConnection);
@@ -249,10 +293,15 @@ void DeskFrame::fileChanged(const QString &path)
                 : Xlate("\"%1\" was changed by another program. Load it again?");
         const MessageAnswer answer = kareport::showMessage(
             {question.arg(path), QString(), MessageButtons::YesNo, kareport::MessageIcon::Question});
-        if (answer == MessageAnswer::Yes && isOpen(document) && !kareport::reloadSavedReport(*document)) {
+        bool isStopped = false;
+        if (answer == MessageAnswer::Yes && isOpen(document) && !kareport::reloadSavedReport(*document, &isStopped) &&
+            isOpen(document))
+        {
             document->SetModifiedFlag(true); // what is shown stands in no file any more
             const QString reason = kareport::whyNotOpened(path);
-            AppMessageBox(reason.isEmpty() ? Xlate("\"%1\" could not be opened.").arg(path) : reason);
+            if (!isStopped) {
+                AppMessageBox(reason.isEmpty() ? Xlate("\"%1\" could not be opened.").arg(path) : reason);
+            }
         }
         return;
     }
@@ -270,6 +319,12 @@ void DeskFrame::about()
 void DeskFrame::closeEvent(QCloseEvent *event)
 {
     if (kareport::isJobRunning()) {
+        event->ignore();
+        kareport::noteExitCancelled();
+        return;
+    }
+    // What is being read is given up first: whoever waits for it must not find the reports gone.
+    if (kareport::stopWorkAside(this, [this] { close(); })) {
         event->ignore();
         kareport::noteExitCancelled();
         return;

@@ -11,6 +11,7 @@
 
 class QMenu;
 class QToolBar;
+class UReportDoc;
 
 namespace kareport
 {
@@ -27,7 +28,9 @@ public:
     const std::vector<kareport::Command> &commands() const override { return commands_; }
 
     /// Opens a job, a saved report, rich text, or a template to make a report from.
-    /// @return false, after a message, when it cannot be opened; also when the user has stopped it
+    /// The windows answer while a long report is read.
+    /// @return false, after a message, when it cannot be opened; also when the user has stopped it. True for a report that is
+    ///         being read already: it comes to the front when it is there
     bool OpenFile(const QString &path);
     /// Makes a report from a template and a data file. @return as `OpenFile`
     bool OpenTemplateJob(const kareport::TemplateJob &job);
@@ -59,6 +62,13 @@ private:
     void fromTemplate(const QString &templateFile);
     void askPreferences();
     bool finishOpening(UDocument *report, const QString &error);
+    /// The report of a file, which is opened where it is not open.
+    /// @param isStopped  receives whether the user has stopped that
+    UDocument *openReport(const QString &file, bool &isStopped);
+    /// Opens a report in whatever way, while its file counts as being opened: what changes in it meanwhile is told.
+    UReportDoc *read(const QString &file, const std::function<UReportDoc *()> &open);
+    /// Opens what a program that crashed had open. @return what could not be opened, and what the user did not wait for
+    std::vector<kareport::KeptReport> reopen(const std::vector<kareport::KeptReport> &left);
     /// Brings a report to the front where it is shown, and shows it where it is not.
     void activate(UDocument *report);
     /// Closes reports that nobody can see or close any more, as after their window was closed. One that has changes is shown
@@ -79,6 +89,7 @@ private:
     std::vector<kareport::Command> commands_;
     QMenu *recentFiles_ = nullptr;
     QToolBar *toolBar_ = nullptr;
+    QStringList reading_; ///< files that are being opened now
     kareport::FileWatch files_;
     kareport::Recovery recovery_;
     kareport::EditorHold editors_;

@@ -28,8 +28,20 @@ FileWatch::Stamp FileWatch::stampOf(const QString &path)
 
 void FileWatch::watch(const QString &path)
 {
-    known_.insert(path, stampOf(path));
+    const Stamp now = stampOf(path);
+    const Stamp known = expected_.contains(path) ? expected_.take(path) : now;
+    known_.insert(path, known);
     watcher_.addPath(path);
+    if (known != now) {
+        timer_.start(settleTime);
+    }
+}
+
+void FileWatch::expect(const QString &path)
+{
+    if (!path.isEmpty()) {
+        expected_.insert(path, stampOf(path));
+    }
 }
 
 void FileWatch::forget(const QString &path)

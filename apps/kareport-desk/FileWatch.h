@@ -20,6 +20,11 @@ public:
 
     /// Watches a file, as it is now: what it holds was read or written by this program.
     void watch(const QString &path);
+    bool isWatched(const QString &path) const { return known_.contains(path); }
+    /// Notes how a file is that is going to be read: the watch that begins next tells what has changed since.
+    void expect(const QString &path);
+    /// The file has not been read.
+    void ceaseToExpect(const QString &path) { expected_.remove(path); }
     void forget(const QString &path);
     /// Forgets all files but these.
     void retain(const QStringList &paths);
@@ -41,6 +46,7 @@ private:
     QFileSystemWatcher watcher_;
     QTimer timer_;
     QHash<QString, Stamp> known_;
+    QHash<QString, Stamp> expected_; ///< as the files were before they were read
 };
 
 } // namespace kareport

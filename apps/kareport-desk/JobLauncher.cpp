@@ -5,21 +5,18 @@
 #include "Interrupt.h"
 #include "JobReader.h"
 #include "JobRunner.h"
-#include "PlainWidgets.h"
 #include "Preferences.h"
 #include "Progress.h"
 #include "ReportWindow.h"
 #include "ReportWindowEntry.h"
+#include "WorkDialog.h"
 #include "Xlate.h"
 
 #include <QCoreApplication>
-#include <QElapsedTimer>
 #include <QFileInfo>
-#include <QLabel>
-#include <QProgressDialog>
 #include <QScopedValueRollback>
 
-#include <climits>
+#include <algorithm>
 #include <new>
 
 namespace kareport
@@ -28,43 +25,27 @@ namespace kareport
 namespace
 {
 
-/// Shows progress in a dialog, which also lets the windows answer while the work runs.
+/// Shows progress in a dialog, and lets the windows answer while the work runs.
 class DialogProgress : public Progress
 {
 public:
-    explicit DialogProgress(QWidget *parent) : Progress(true), dialog_(QString(), Xlate("Cancel"), 0, 100, parent)
-    {
-        dialog_.setLabel(plainLabel()); // it names files
-        dialog_.setWindowModality(Qt::ApplicationModal);
-        // Only this class says when it comes and goes: while it is not there, nothing keeps the user from other windows.
-        dialog_.setMinimumDuration(INT_MAX);
-        dialog_.setAutoReset(false);
-        dialog_.setAutoClose(false);
-        dialog_.reset();
-        sinceStart_.start();
-        QObject::connect(&dialog_, &QProgressDialog::canceled, &dialog_, [] { setInterrupted(true); });
-    }
+    explicit DialogProgress(QWidget *parent) : Progress(true), dialog_(parent, [] { setInterrupted(true); }) {}
 
-    void finish() override { dialog_.reset(); }
+    void finish() override { dialog_.hide(); }
 
 protected:
     void show(std::size_t done) override
     {
-        constexpr qint64 shortWork = 500; // milliseconds
-        if (sinceStart_.elapsed() < shortWork) {
+        if (!dialog_.isDue()) {
             QCoreApplication::processEvents(QEventLoop::ExcludeUserInputEvents);
             return;
         }
-        dialog_.setLabelText(what());
-        dialog_.show();
-        dialog_.setRange(0, total() > 0 ? 100 : 0);
-        dialog_.setValue(total() > 0 ? static_cast<int>(std::min(done, total()) * 100 / total()) : 0);
+        dialog_.show(what(), total() > 0 ? static_cast<int>(std::min(done, total()) * 100 / total()) : -1);
         QCoreApplication::processEvents();
     }
 
 private:
-    QProgressDialog dialog_;
-    QElapsedTimer sinceStart_;
+    WorkDialog dialog_;
 };
 
 bool &runningJob()

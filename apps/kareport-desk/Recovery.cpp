@@ -3,7 +3,9 @@
 #include "MemoryLasts.h"
 #include "PdfFile.h"
 #include "ReportEntry.h"
+#include "ReportPages.h"
 #include "SavedReports.h"
+#include "TextFile.h"
 #include "UReportDoc.h"
 #include "UReportView.h"
 #include "UReportWindowDlg.h"
@@ -50,24 +52,28 @@ const UReportView *formattedView(const UReportDoc &report)
     return nullptr;
 }
 
-/// A text that a program kept; nothing when it cannot be read.
-std::optional<QString> readText(const QString &path)
+/// A text that a program kept.
+TextFile readText(const KeptReport &kept)
 {
-    QFile file(path);
-    if (!RecoveryFolder(QFileInfo(path).path()).holdsText(path) || !file.open(QIODevice::ReadOnly)) {
-        return std::nullopt;
+    if (!Recovery::holdsText(kept)) {
+        return {};
     }
-    const QByteArray bytes = file.readAll();
-    return file.error() == QFileDevice::NoError ? std::optional(QString::fromUtf8(bytes)) : std::nullopt;
+    return readTextFile(kept.textFile, UserInput::Taken,
+                        [lines = kept.pageLines](QByteArrayView bytes, LoadedText &loaded, const auto &proceed) {
+                            const TextLoading answer = loadPlainText(bytes, loaded, proceed);
+                            if (answer == TextLoading::Whole && !lines.empty()) {
+                                loaded.pageStarts = loaded.text.isNarrow()
+                                                        ? startsOfLines(loaded.text.narrowView(), lines)
+                                                        : startsOfLines(loaded.text.view(), lines);
+                            }
+                            return answer;
+                        });
 }
 
 /// Gives a report the text that was kept of it. @return whether it has all of it
-bool fill(UReportDoc &report, const KeptReport &kept, const QString &text)
+bool fill(UReportDoc &report, const KeptReport &kept, LoadedText &text)
 {
-    report.SetData(text);
-    if (!kept.pageLines.empty()) {
-        report.SetPageStarts(startsOfLines(QStringView(text), kept.pageLines));
-    }
+    report.TakeText(text);
     fixPage(report, kept);
     if (!kept.path.isEmpty() && !isPdfName(kept.path)) {
         report.SetPathName(kept.path, false);
@@ -180,8 +186,7 @@ void Recovery::discardLeft(const std::vector<KeptReport> &lost)
 {
     const auto isKept = [&lost](const Left &left) {
         return std::any_of(lost.begin(), lost.end(), [&left](const KeptReport &kept) {
-            return !kept.textFile.isEmpty() && QFileInfo(kept.textFile).path() == left.folder.path() &&
-                   left.folder.holdsText(kept.textFile);
+            return QFileInfo(kept.textFile).path() == left.folder.path() && holdsText(kept);
         });
     };
     for (const Left &left : left_) {
@@ -194,10 +199,15 @@ void Recovery::discardLeft(const std::vector<KeptReport> &lost)
     std::erase_if(left_, std::not_fn(isKept));
 }
 
-UReportDoc *Recovery::reopen(const KeptReport &kept)
+bool Recovery::holdsText(const KeptReport &kept)
+{
+    return !kept.textFile.isEmpty() && RecoveryFolder(QFileInfo(kept.textFile).path()).holdsText(kept.textFile);
+}
+
+UReportDoc *Recovery::reopen(const KeptReport &kept, bool *isStopped)
 {
     if (kept.textFile.isEmpty()) {
-        UReportDoc *saved = openSavedReport(kept.path);
+        UReportDoc *saved = openSavedReport(kept.path, isStopped);
         if (saved != nullptr && !saved->IsPageFixed()) {
             fixPage(*saved, kept);
         }
@@ -205,9 +215,12 @@ UReportDoc *Recovery::reopen(const KeptReport &kept)
     }
     UReportDoc *report = nullptr;
     const bool isWhole = whileMemoryLasts(false, [&] {
-        const auto text = readText(kept.textFile);
-        report = text ? CreateReport(kept.title, true, false, nullptr, 0, nullptr) : nullptr;
-        return report != nullptr && fill(*report, kept, *text);
+        const TextFile read = readText(kept);
+        if (isStopped != nullptr) {
+            *isStopped = read.state == TextFile::State::Stopped;
+        }
+        report = read.text ? CreateReport(kept.title, true, false, nullptr, 0, nullptr) : nullptr;
+        return report != nullptr && fill(*report, kept, *read.text);
     });
     if (!isWhole && UReportDoc::IsReportAvailable(report)) {
         report->OnCloseDocument(); // what is kept on the disk is all that there is

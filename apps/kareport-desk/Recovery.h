@@ -46,8 +46,11 @@ public:
 
     /// What programs that crashed had open, the reports that were opened first coming first.
     std::vector<KeptReport> leftReports() const;
-    /// Opens one of them again, with what was not saved. @return null when it cannot be opened, or there is no memory for it
-    static UReportDoc *reopen(const KeptReport &kept);
+    /// Opens one of them again, with what was not saved. @param isStopped  receives whether the user has stopped it; may be
+    /// null. @return null when it cannot be opened, there is no memory for it, or it was stopped
+    static UReportDoc *reopen(const KeptReport &kept, bool *isStopped = nullptr);
+    /// Whether the text of one of them is still there.
+    static bool holdsText(const KeptReport &kept);
     /// Folders of programs that crashed whose lists cannot be read. They stay as they are.
     const QStringList &unreadableFolders() const { return unreadable_; }
     /// Throws away what crashed programs left. @param lost  what could not be opened again: a folder that holds such a text

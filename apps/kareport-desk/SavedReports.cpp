@@ -1,13 +1,12 @@
 #include "SavedReports.h"
 
-#include "FileBytes.h"
+#include "LoadedText.h"
 #include "MemoryLasts.h"
 #include "PdfFile.h"
 #include "ReportContent.h"
 #include "ReportEntry.h"
-#include "ReportTextDecoder.h"
-#include "RichTextReader.h"
 #include "SavedText.h"
+#include "TextFile.h"
 #include "UReportDoc.h"
 #include "Xlate.h"
 
@@ -23,53 +22,44 @@ namespace
 {
 
 /// The text of a report file as it was before it was saved: each line end once, and UTF-8 as the characters that it stands
-/// for. Nothing for rich text and for what is no UTF-8, which the report loads byte by byte. An error when the file cannot
-/// be read, or is cut short meanwhile: what is left of it is not what was saved.
-Expected<std::optional<QString>> exactText(const QString &path)
+/// for. Rich text, and what is no UTF-8, is another text, which the report loads byte by byte.
+TextFile readReportFile(const QString &path, UserInput input)
 {
     if (path.endsWith(u".rtf", Qt::CaseInsensitive)) {
-        return std::nullopt;
+        return {TextFile::State::OtherText, nullptr};
     }
-    const auto file = FileBytes::open(path);
-    if (const InputError *error = errorOf(file)) {
-        return *error;
-    }
-    const auto &saved = *std::get<std::shared_ptr<const FileBytes>>(file);
-    const std::string_view view = saved.view();
-    QString text;
-    const QByteArrayView bytes(view.data(), static_cast<qsizetype>(view.size()));
-    const bool isOther = decodeReportText(bytes, text) || isRichText(text);
-    if (const auto lost = saved.lostBytes()) {
-        return *lost;
-    }
-    return isOther ? std::nullopt : std::optional(std::move(text));
+    return readTextFile(path, input, loadReportText);
 }
 
-/// Its pages are those that it was written in, whatever a page would be measured to now.
-void keepPageLength(UReportDoc &report, QStringView text)
-{
-    if (const auto lines = linesOfPages(text)) {
-        report.FixPage(lines, std::nullopt);
-    }
-}
-
-/// The same of a report that was loaded byte by byte, or as rich text: what counts is what it shows.
+/// The pages of a report that was loaded byte by byte, or as rich text, are those that it was written in, whatever a page
+/// would be measured to now. What counts is what it shows.
 UReportDoc *withPageLength(UReportDoc *report)
 {
     if (report != nullptr) {
-        keepPageLength(*report, shownPlainText(*report));
+        if (const auto lines = linesOfPages(shownPlainText(*report))) {
+            report->FixPage(lines, std::nullopt);
+        }
     }
     return report;
 }
 
 /// @return whether the report has all of the text
-bool fill(UReportDoc &report, const QString &text)
+bool fill(UReportDoc &report, LoadedText &loaded)
 {
+    // A window that shows the report while it is written is told line by line.
+    const bool isWatched = report.GetReportWindow() != nullptr;
+    const QString copy = isWatched ? loaded.text.piece(0, loaded.text.size()) : QString();
     report.Clear();
-    keepPageLength(report, text);
+    if (loaded.linesPerPage) {
+        report.FixPage(loaded.linesPerPage, std::nullopt);
+    }
     report.SetPageSize();
-    writeLines(report, text);
-    report.FindPageStarts();
+    if (isWatched) {
+        writeLines(report, copy);
+        report.FindPageStarts();
+    } else {
+        report.TakeText(loaded);
+    }
     report.UpdateAllViews(nullptr, 0, nullptr);
     report.SetModifiedFlag(false);
     return !report.HasLostText();
@@ -84,19 +74,22 @@ void forgetPageLengthOfText(UReportDoc &report)
     }
 }
 
-bool reload(UReportDoc &report)
+bool reload(UReportDoc &report, bool &isStopped)
 {
     if (!whyNotOpened(report.GetPathName()).isEmpty() || !QFile(report.GetPathName()).open(QIODevice::ReadOnly)) {
         return false; // what is shown is then all that there is
     }
-    const auto read = exactText(report.GetPathName());
-    if (errorOf(read) != nullptr) {
+    // What the user types until the file has been read would go with the text before it.
+    const TextFile read = readReportFile(report.GetPathName(), UserInput::Kept);
+    isStopped = read.state == TextFile::State::Stopped;
+    const bool isRead = read.state == TextFile::State::Whole || read.state == TextFile::State::OtherText;
+    if (!isRead || !UReportDoc::IsReportAvailable(&report)) {
         return false;
     }
     report.SetRTFDataFlag(false); // in rich-text mode nothing is loaded
     forgetPageLengthOfText(report);
-    if (const auto &text = std::get<std::optional<QString>>(read)) {
-        return fill(report, *text);
+    if (read.text) {
+        return fill(report, *read.text);
     }
     report.Clear();
     const bool isLoaded = report.OnOpenDocument(report.GetPathName());
@@ -119,23 +112,22 @@ QString whyNotOpened(const QString &path)
     return isPdfFile(path) ? Xlate("A PDF cannot be opened as a report") : QString();
 }
 
-UReportDoc *openSavedReport(const QString &path)
+UReportDoc *openSavedReport(const QString &path, bool *isStopped)
 {
     if (!whyNotOpened(path).isEmpty()) {
         return nullptr;
     }
-    const auto read = exactText(path);
-    if (errorOf(read) != nullptr) {
-        return nullptr;
+    const TextFile read = readReportFile(path, UserInput::Taken);
+    if (isStopped != nullptr) {
+        *isStopped = read.state == TextFile::State::Stopped;
     }
-    const auto &text = std::get<std::optional<QString>>(read);
-    if (!text) {
+    if (read.state == TextFile::State::OtherText) {
         return withPageLength(
             dynamic_cast<UReportDoc *>(GetReportTemplate()->OpenReportDocumentFile(path, 1, 1, nullptr, 0, nullptr)));
     }
-    UReportDoc *report = CreateReport(QString(), true, false, nullptr, 0, nullptr);
+    UReportDoc *report = read.text ? CreateReport(QString(), true, false, nullptr, 0, nullptr) : nullptr;
     if (report != nullptr) {
-        if (!fill(*report, *text)) {
+        if (!fill(*report, *read.text)) {
             report->OnCloseDocument();
             return nullptr;
         }
@@ -145,9 +137,14 @@ UReportDoc *openSavedReport(const QString &path)
     return report;
 }
 
-bool reloadSavedReport(UReportDoc &report)
+bool reloadSavedReport(UReportDoc &report, bool *isStopped)
 {
-    return whileMemoryLasts(false, [&report] { return reload(report); });
+    bool wasStopped = false;
+    const bool isLoaded = whileMemoryLasts(false, [&] { return reload(report, wasStopped); });
+    if (isStopped != nullptr) {
+        *isStopped = wasStopped;
+    }
+    return isLoaded;
 }
 
 } // namespace kareport
