@@ -1,8 +1,10 @@
 #include "ReportEdit.h"
 
+#include "LinePager.h"
 #include "PrintQt.h"
 
 #include <QMimeData>
+#include <QPrinter>
 #include <QScrollBar>
 #include <QTest>
 #include <QTextBlock>
@@ -200,6 +202,66 @@ TEST(ReportEdit, ZoomScalesEveryFontAndChangesNone)
     edit.setZoomPercent(100);
     EXPECT_NEAR(heightOf(0), small, 0.01);
     EXPECT_NEAR(heightOf(1), large, 0.01);
+}
+
+TEST(ReportEdit, TabStopsAreEightCharactersApartAtEveryZoom)
+{
+    ReportEdit edit;
+    edit.setReportFont(QFont(QStringLiteral("DejaVu Sans Mono"), 10));
+    edit.resize(600, 400);
+    edit.show();
+    edit.loadPlainText(QStringLiteral("\tx\n        x"));
+    QPrinter printer(QPrinter::HighResolution);
+    printer.setOutputFormat(QPrinter::PdfFormat);
+    const auto left = [&edit](int block, int at) {
+        QTextCursor cursor(edit.document()->findBlockByNumber(block));
+        cursor.movePosition(QTextCursor::Right, QTextCursor::MoveAnchor, at);
+        return edit.cursorRect(cursor).left();
+    };
+    double printed = 0;
+    for (const int zoom : {100, 50, 150, 200, 400, 100}) {
+        edit.setZoomPercent(zoom);
+        EXPECT_NEAR(left(0, 1), left(1, 8), left(1, 8) / 10.0) << "by less than a character: " << zoom;
+        const double width = kareport::LinePager(*edit.document(), printer).measure(0, 3).widestRow;
+        printed = printed == 0 ? width : printed;
+        EXPECT_EQ(width, printed) << "printing does not depend on it: " << zoom;
+    }
+}
+
+TEST(ReportEdit, GlyphsAreKeptWhereTheNextKeyPaints)
+{
+    ReportEdit edit;
+    edit.resize(600, 400);
+    edit.show();
+    edit.loadPlainText(QStringLiteral("line\n").repeated(20));
+    edit.setCursorWidth(0); // it blinks
+    const auto keptLines = [&edit] {
+        edit.grab();
+        QList<int> kept;
+        for (QTextBlock block = edit.document()->begin(); block.isValid(); block = block.next()) {
+            if (block.layout()->cacheEnabled()) {
+                kept.append(block.blockNumber());
+            }
+        }
+        return kept;
+    };
+    EXPECT_EQ(keptLines(), (QList<int>{0, 1}));
+    QTextCursor cursor(edit.document()->findBlockByNumber(7));
+    edit.setTextCursor(cursor);
+    EXPECT_EQ(keptLines(), (QList<int>{6, 7, 8})) << "and no others: they would take memory";
+    QTest::keyClicks(&edit, QStringLiteral("abc"));
+    const QImage kept = edit.viewport()->grab().toImage();
+    ReportEdit other;
+    other.resize(600, 400);
+    other.show();
+    other.loadPlainText(edit.document()->toPlainText());
+    other.setCursorWidth(0);
+    other.setTextCursor([&other, at = edit.textCursor().position()] {
+        QTextCursor same(other.document());
+        same.setPosition(at);
+        return same;
+    }());
+    EXPECT_EQ(kept, other.viewport()->grab().toImage()) << "what is shown is the same";
 }
 
 TEST(ReportEdit, ZoomHoldsForWhatIsLoadedLater)

@@ -140,6 +140,54 @@ TEST(ReportViewWidget, AsksForAPageByTheKeyboard)
     EXPECT_EQ(widget.currentPage(), 9);
 }
 
+/// Counts the times that a widget is laid out anew.
+class LayoutCount : public QObject
+{
+public:
+    explicit LayoutCount(QWidget &watched) { watched.installEventFilter(this); }
+    int count = 0;
+
+protected:
+    bool eventFilter(QObject *watched, QEvent *event) override
+    {
+        count += event->type() == QEvent::LayoutRequest ? 1 : 0;
+        return QObject::eventFilter(watched, event);
+    }
+};
+
+TEST(ReportViewWidget, AKeyLaysNothingOutAnew)
+{
+    QWidget window;
+    ReportViewWidget widget(&window);
+    window.show();
+    widget.edit().loadPlainText(QStringLiteral("line\n").repeated(300));
+    QCoreApplication::processEvents();
+    LayoutCount inside(widget);
+    LayoutCount around(window);
+    const QString before = placeIn(widget);
+    QTest::keyClicks(&widget.edit(), QStringLiteral("xy"));
+    putCursor(widget.edit(), 1200);
+    EXPECT_NE(placeIn(widget), before);
+    EXPECT_EQ(inside.count, 0);
+    EXPECT_EQ(around.count, 0);
+}
+
+TEST(ReportViewWidget, ThePlaceIsShownWholeHoweverLongItIs)
+{
+    ReportViewWidget widget;
+    widget.resize(900, 300);
+    widget.show();
+    widget.setLinesPerPage([] { return 1; });
+    widget.edit().loadPlainText(QStringLiteral("x\n").repeated(123'456));
+    putCursor(widget.edit(), 246'910);
+    EXPECT_TRUE(placeIn(widget).startsWith(QStringLiteral("Page 123456 of 123456,")));
+    QCoreApplication::processEvents();
+    for (const QLabel *label : {&widget.pageLabel(), &widget.lineLabel(), &widget.columnLabel()}) {
+        EXPECT_GE(label->width(), label->fontMetrics().horizontalAdvance(label->text())) << label->text().toStdString();
+        EXPECT_GE(label->height(), label->fontMetrics().height());
+    }
+}
+
 TEST(ReportViewWidget, EveryControlHasAName)
 {
     ReportViewWidget widget;

@@ -8,6 +8,7 @@
 #include <QScrollBar>
 #include <QTextBlock>
 #include <QTextDocument>
+#include <QTextLayout>
 #include <QWheelEvent>
 
 #include <algorithm>
@@ -327,11 +328,10 @@ void ReportEdit::zoomStep(int direction)
 void ReportEdit::applyZoom()
 {
     // Fonts stay as they are named. They are measured for a device of more dots, which scales the sizes that rich text
-    // names as well as the report's own.
+    // names as well as the report's own, and the distance of tab stops. That stays too: printing goes by it.
     QAbstractTextDocumentLayout *layout = document()->documentLayout();
     const bool wasZoomed = layout->paintDevice() != nullptr;
-    const double tabs = tabWidth * QFontMetricsF(font()).horizontalAdvance(QLatin1Char('x'));
-    setTabStopDistance(tabs * zoom_ / 100);
+    setTabStopDistance(tabWidth * QFontMetricsF(font()).horizontalAdvance(QLatin1Char('x')));
     if (zoom_ == 100) {
         layout->setPaintDevice(nullptr);
     } else {
@@ -400,6 +400,26 @@ void ReportEdit::focusInEvent(QFocusEvent *event)
     if (focused_) {
         focused_();
     }
+}
+
+void ReportEdit::keepGlyphs(int line, bool on)
+{
+    for (int number = line - 1; number <= line + 1; ++number) {
+        if (const QTextBlock block = document()->findBlockByNumber(number); block.isValid()) {
+            block.layout()->setCacheEnabled(on);
+        }
+    }
+}
+
+void ReportEdit::paintEvent(QPaintEvent *event)
+{
+    // A key paints the cursor's line and touches those beside it. Finding their glyphs anew is most of the work.
+    if (const int line = textCursor().blockNumber(); line != keptLine_) {
+        keepGlyphs(keptLine_, false);
+        keptLine_ = line;
+    }
+    keepGlyphs(keptLine_, true);
+    QPlainTextEdit::paintEvent(event);
 }
 
 void ReportEdit::insertFromMimeData(const QMimeData *source)

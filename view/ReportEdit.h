@@ -84,6 +84,7 @@ protected:
     void keyPressEvent(QKeyEvent *event) override;
     void wheelEvent(QWheelEvent *event) override;
     void focusInEvent(QFocusEvent *event) override;
+    void paintEvent(QPaintEvent *event) override;
     void insertFromMimeData(const QMimeData *source) override;
 
 private:
@@ -106,6 +107,7 @@ private:
     void noteEdit(int position, int removed, int added);
     void noteLength();
     void applyZoom();
+    void keepGlyphs(int line, bool on);
 
     std::function<void(const ReportChange &)> edited_;
     std::function<void()> focused_;
@@ -120,6 +122,7 @@ private:
     bool isFollowing_ = false;
     int length_ = 0;
     int lineEnds_ = 0;
+    int keptLine_ = -1; ///< whose glyphs are kept, and those of the lines beside it
     int zoom_ = 100;
     int wheel_ = 0; ///< eighths of a degree turned since the last step
     QImage zoomDevice_;

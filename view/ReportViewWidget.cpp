@@ -27,12 +27,23 @@ namespace
 
 constexpr int usualLinesPerPage = 72;
 
+/// Shows a text in a label that is as wide as the widest of its texts so far. A label of one size lays nothing out anew,
+/// neither here nor in the windows around it: that would happen at every key.
+void showIn(QLabel &label, const QString &text)
+{
+    const QFontMetrics metrics = label.fontMetrics();
+    const int width = metrics.horizontalAdvance(text) + metrics.averageCharWidth();
+    const bool isSized = label.minimumWidth() == label.maximumWidth();
+    label.setFixedSize(isSized ? std::max(width, label.minimumWidth()) : width, metrics.height());
+    label.setText(text);
+}
+
 QLabel *newLabel(QWidget *parent, const QString &name, const QString &widest)
 {
     auto *label = plainLabel(QString(), parent);
     label->setAccessibleName(name);
-    // A label of one width is not laid out anew at every key.
-    label->setMinimumWidth(label->fontMetrics().horizontalAdvance(widest));
+    showIn(*label, widest);
+    label->clear();
     return label;
 }
 
@@ -56,7 +67,7 @@ ReportViewWidget::ReportViewWidget(QWidget *parent)
       pageLabel_(newLabel(this, Xlate("Page"), Xlate("Page %1 of %2").arg(88888).arg(88888))),
       lineLabel_(newLabel(this, Xlate("Line"), Xlate("Line %1").arg(8888888))),
       columnLabel_(newLabel(this, Xlate("Column"), Xlate("Column %1").arg(8888))),
-      loadLabel_(newLabel(this, Xlate("Loading"), QString())),
+      loadLabel_(newLabel(this, Xlate("Loading"), Xlate("Loading %1 %@@percent of a report").arg(100))),
       zoomLabel_(newLabel(this, Xlate("Zoom"), Xlate("%1 %@@zoom in percent").arg(888)))
 {
     auto *status = new QHBoxLayout;
@@ -169,20 +180,20 @@ void ReportViewWidget::goToPage(int page)
 void ReportViewWidget::showPlace()
 {
     const QTextCursor cursor = edit_->textCursor();
-    pageLabel_->setText(Xlate("Page %1 of %2").arg(currentPage()).arg(pageCount()));
-    lineLabel_->setText(Xlate("Line %1").arg(cursor.blockNumber() + 1));
-    columnLabel_->setText(Xlate("Column %1").arg(columnOf(cursor)));
+    showIn(*pageLabel_, Xlate("Page %1 of %2").arg(currentPage()).arg(pageCount()));
+    showIn(*lineLabel_, Xlate("Line %1").arg(cursor.blockNumber() + 1));
+    showIn(*columnLabel_, Xlate("Column %1").arg(columnOf(cursor)));
 }
 
 void ReportViewWidget::showLoading()
 {
-    loadLabel_->setText(edit_->isLoading() ? Xlate("Loading %1 %@@percent of a report").arg(edit_->loadedPercent())
-                                           : QString());
+    showIn(*loadLabel_,
+           edit_->isLoading() ? Xlate("Loading %1 %@@percent of a report").arg(edit_->loadedPercent()) : QString());
 }
 
 void ReportViewWidget::showZoom()
 {
-    zoomLabel_->setText(Xlate("%1 %@@zoom in percent").arg(edit_->zoomPercent()));
+    showIn(*zoomLabel_, Xlate("%1 %@@zoom in percent").arg(edit_->zoomPercent()));
 }
 
 void ReportViewWidget::openFindBar()
