@@ -2,6 +2,8 @@
 
 #include <QByteArrayView>
 
+#include <cstdint>
+#include <cstring>
 #include <type_traits>
 
 namespace kareport
@@ -10,10 +12,32 @@ namespace kareport
 namespace
 {
 
-// Most pieces hold none, which is found faster than a number.
+/// Whether a text holds a line feed. Most pieces are short and hold none, and the library's own search, which is made for
+/// long texts, takes most of its time to begin.
+bool holdsLineFeed(QStringView text)
+{
+    constexpr std::uint64_t ones = 0x0001000100010001;
+    constexpr qsizetype atOnce = sizeof ones / sizeof(char16_t);
+    const char16_t *at = text.utf16();
+    const char16_t *const end = at + text.size();
+    std::uint64_t found = 0;
+    for (; end - at >= atOnce; at += atOnce) {
+        std::uint64_t word;
+        std::memcpy(&word, at, sizeof word);
+        // A line feed becomes 0, and taking 1 from it sets the top bit that it did not have.
+        const std::uint64_t difference = word ^ (ones * u'\n');
+        found |= (difference - ones) & ~difference & (ones << 15);
+    }
+    bool isFound = found != 0;
+    for (; at != end; ++at) {
+        isFound = isFound || *at == u'\n';
+    }
+    return isFound;
+}
+
 qsizetype countAll(QStringView text)
 {
-    return text.contains(u'\n') ? text.count(u'\n') : 0;
+    return holdsLineFeed(text) ? text.count(u'\n') : 0;
 }
 
 qsizetype countAll(QLatin1StringView text)

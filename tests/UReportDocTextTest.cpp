@@ -290,4 +290,23 @@ TEST(UReportDocText, ATextThatWasMadeElsewhereIsTakenOver)
     EXPECT_EQ(loaded.text.view().toString(), QStringLiteral("before\r\n"));
 }
 
+TEST(UReportDocText, LineFeedsInATextAreCountedWhereverTheyStand)
+{
+    for (qsizetype length = 0; length < 20; ++length) {
+        for (qsizetype first = 0; first < length; ++first) {
+            for (qsizetype second = first; second < length; ++second) {
+                TextReport t;
+                QString text(length, u'\u010A'); // whose low byte is a line feed's
+                text[first] = u'\n';
+                text[second] = u'\n';
+                t.report.Write(text, 0);
+                ASSERT_EQ(t.report.GetLineCount(), first == second ? 1 : 2) << length << ' ' << first << ' ' << second;
+            }
+        }
+        TextReport t;
+        t.report.Write(QString(length, u'\u000B'), 0);
+        ASSERT_EQ(t.report.GetLineCount(), 0) << length;
+    }
+}
+
 } // namespace
