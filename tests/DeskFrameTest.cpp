@@ -358,6 +358,34 @@ TEST(DeskFrame, WindowsOfAReportAreTiledAndJoined)
     desk.answer = MessageAnswer::No;
 }
 
+TEST(DeskFrame, AKeyGoesFromReportToReport)
+{
+    Desk desk;
+    for (int i = 0; i < 3; ++i) {
+        ASSERT_TRUE(desk.frame->OnCommand(fileNewCommand));
+    }
+    const auto reports = Desk::reports();
+    const auto press = [&desk](Qt::KeyboardModifiers modifiers) {
+        desk.frame->activateWindow();
+        EXPECT_TRUE(QTest::qWaitFor([] { return QApplication::focusWidget() != nullptr; }));
+        desk.frame->UpdateCommands();
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Tab, modifiers);
+        return desk.frame->GetActiveView() != nullptr ? desk.frame->GetActiveView()->GetDocument() : nullptr;
+    };
+    constexpr Qt::KeyboardModifiers forward = Qt::ControlModifier;
+    constexpr Qt::KeyboardModifiers back = Qt::ControlModifier | Qt::ShiftModifier;
+    EXPECT_EQ(press(forward), reports[0]) << "the first comes after the last";
+    EXPECT_EQ(press(forward), reports[1]);
+    EXPECT_EQ(press(back), reports[0]);
+    EXPECT_EQ(press(back), reports[2]);
+    EXPECT_TRUE(desk.frame->GetActiveView()->GetWidget()->isAncestorOf(QApplication::focusWidget()))
+        << "with the keyboard";
+    EXPECT_TRUE(reports[2]->IsEmpty()) << "and nothing is typed";
+    reports[0]->GetViews().front()->GetParentPane()->ShowPane(false); // as while an editor has it
+    EXPECT_EQ(press(forward), reports[1]) << "what nobody can see is passed over";
+    desk.answer = MessageAnswer::No;
+}
+
 TEST(DeskFrame, ClosingAsksForEveryReportThatHasChanged)
 {
     struct Row

@@ -110,6 +110,23 @@ TEST(DeskLongReport, ThatIsBeingReadIsNotOpenedTwice)
     EXPECT_TRUE(desk.messages.isEmpty());
 }
 
+TEST(DeskLongReport, WhoseFileAnotherReportIsSavedIntoMeanwhileIsThatReport)
+{
+    const JobFolder folder;
+    folder.put("a.rep", longFile());
+    folder.put("b.rep", "\xEF\xBB\xBFTALVEN b\r\r\n");
+    Desk desk;
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("b.rep")));
+    UReportDoc *other = Desk::reports().front();
+    meanwhile([&] {
+        EXPECT_TRUE(other->OnSaveDocument(folder.path("a.rep")));
+        other->SetPathName(folder.path("a.rep"), true);
+    });
+    EXPECT_TRUE(desk.frame->OpenFile(folder.path("a.rep")));
+    EXPECT_EQ(Desk::reports(), std::vector<UReportDoc *>{other}) << "two of them would overwrite each other";
+    EXPECT_EQ(desk.frame->GetActiveView(), other->GetViews().front());
+}
+
 TEST(DeskLongReport, LeavesRoomForOthersMeanwhile)
 {
     const JobFolder folder;
@@ -222,13 +239,13 @@ TEST(DeskLongReport, IsLoadedAgainWhileTheWindowsAnswer)
     UReportDoc *report = Desk::reports().front();
     const QByteArray content = longFile();
     folder.put("a.rep", content);
-    bool isStopped = false;
+    kareport::ReadNotes notes;
     meanwhile([] { kareport::stopWorkAside(nullptr, {}); });
-    EXPECT_FALSE(kareport::reloadSavedReport(*report, &isStopped));
-    EXPECT_TRUE(isStopped);
+    EXPECT_FALSE(kareport::reloadSavedReport(*report, &notes));
+    EXPECT_TRUE(notes.isStopped);
     EXPECT_EQ(Desk::textOf(*report), QStringLiteral("TALVEN short\n")) << "it stays as it was";
-    EXPECT_TRUE(kareport::reloadSavedReport(*report, &isStopped));
-    EXPECT_FALSE(isStopped);
+    EXPECT_TRUE(kareport::reloadSavedReport(*report, &notes));
+    EXPECT_FALSE(notes.isStopped);
     EXPECT_TRUE(Desk::textOf(*report) == textOfFile(content));
     ASSERT_TRUE(isShownWhole(*report));
     meanwhile([report] { report->OnCloseDocument(); });

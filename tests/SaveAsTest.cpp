@@ -319,4 +319,30 @@ TEST(SaveAs, CharactersThatNoFaceHasAreSaid)
     EXPECT_TRUE(desk.messages.isEmpty()) << "nothing is said where all is well";
 }
 
+TEST(SaveAs, AFileThatIsOpenAsAnotherReportIsNotReplaced)
+{
+    const JobFolder folder;
+    const QByteArray content = "\xEF\xBB\xBFTALVEN other\r\r\n";
+    folder.put("other.rep", content);
+    ASSERT_TRUE(QFile::link(folder.path("other.rep"), folder.path("link.rep")));
+    SavingDesk desk;
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("other.rep")));
+    UReportDoc *report = newReport();
+    desk.typed = {folder.path("other.rep"), folder.path("link.rep"), folder.path("mine.rep")};
+    EXPECT_TRUE(report->DoSave(QString(), true)) << "the dialog comes back for another name";
+    ASSERT_EQ(desk.messages.size(), 2);
+    EXPECT_TRUE(desk.messages[0].contains(QStringLiteral("is open as another report")))
+        << desk.messages[0].toStdString();
+    EXPECT_TRUE(desk.messages[1].contains(QStringLiteral("is open as another report"))) << "by whatever name";
+    EXPECT_EQ(folder.bytesOf("other.rep"), content);
+    EXPECT_EQ(report->GetPathName(), folder.path("mine.rep"));
+
+    desk.messages.clear();
+    desk.typed = {folder.path("mine.rep")};
+    desk.answers = {MessageAnswer::Yes};
+    EXPECT_TRUE(report->DoSave(QString(), true)) << "its own file is only asked about";
+    ASSERT_EQ(desk.messages.size(), 1);
+    EXPECT_TRUE(desk.messages[0].contains(QStringLiteral("already")));
+}
+
 } // namespace

@@ -614,6 +614,12 @@
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
+        <source>Loading %1 %</source>
+        <comment>percent of a report</comment>
+        <translation>%1 % geladen</translation>
+    </message>
+    <message>
+        <location filename="../view/ReportViewWidget.cpp"/>
         <source>Zoom</source>
         <translation>Zoom</translation>
     </message>
@@ -622,12 +628,6 @@
         <source>%1 %</source>
         <comment>zoom in percent</comment>
         <translation>%1 %</translation>
-    </message>
-    <message>
-        <location filename="../view/ReportViewWidget.cpp"/>
-        <source>Loading %1 %</source>
-        <comment>percent of a report</comment>
-        <translation>%1 % geladen</translation>
     </message>
     <message>
         <location filename="../view/UReportViewPrint.cpp"/>
@@ -1472,6 +1472,15 @@
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
+        <source>"%1" was opened, but not all of it is shown:
+
+%2</source>
+        <translation>„%1“ wurde geöffnet, aber nicht alles daraus wird angezeigt:
+
+%2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>Open a job or a saved report, or drop it here.</source>
         <translation>Auftrag oder gespeicherten Bericht öffnen oder hierher ziehen.</translation>
     </message>
@@ -1617,6 +1626,16 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>Ne&amp;xt Report	Ctrl+Tab</source>
+        <translation>Nächster &amp;Bericht	Ctrl+Tab</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>Pre&amp;vious Report	Ctrl+Shift+Tab</source>
+        <translation>&amp;Voriger Bericht	Ctrl+Shift+Tab</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Toolbar</source>
         <translation>Symbolleiste</translation>
     </message>
@@ -1749,6 +1768,11 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
         <source>There is no folder "%1". Choose another one, or create it first.</source>
         <translation>Der Ordner „%1“ ist nicht vorhanden. Wählen Sie einen anderen, oder legen Sie ihn zuerst an.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SaveAs.cpp"/>
+        <source>"%1" is open as another report. Close that one first, or choose another name.</source>
+        <translation>„%1“ ist als anderer Bericht geöffnet. Schließen Sie ihn zuerst, oder wählen Sie einen anderen Namen.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>

@@ -614,6 +614,12 @@
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
+        <source>Loading %1 %</source>
+        <comment>percent of a report</comment>
+        <translation>読み込み中 %1 %</translation>
+    </message>
+    <message>
+        <location filename="../view/ReportViewWidget.cpp"/>
         <source>Zoom</source>
         <translation>ズーム</translation>
     </message>
@@ -622,12 +628,6 @@
         <source>%1 %</source>
         <comment>zoom in percent</comment>
         <translation>%1%</translation>
-    </message>
-    <message>
-        <location filename="../view/ReportViewWidget.cpp"/>
-        <source>Loading %1 %</source>
-        <comment>percent of a report</comment>
-        <translation>読み込み中 %1 %</translation>
     </message>
     <message>
         <location filename="../view/UReportViewPrint.cpp"/>
@@ -1472,6 +1472,15 @@
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
+        <source>"%1" was opened, but not all of it is shown:
+
+%2</source>
+        <translation>「%1」を開きましたが、表示されない内容があります:
+
+%2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>Open a job or a saved report, or drop it here.</source>
         <translation>ジョブまたは保存した帳票を開くか、ここにドロップしてください。</translation>
     </message>
@@ -1617,6 +1626,16 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>Ne&amp;xt Report	Ctrl+Tab</source>
+        <translation>次のレポート(&amp;X)	Ctrl+Tab</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>Pre&amp;vious Report	Ctrl+Shift+Tab</source>
+        <translation>前のレポート(&amp;V)	Ctrl+Shift+Tab</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Toolbar</source>
         <translation>ツールバー</translation>
     </message>
@@ -1749,6 +1768,11 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
         <source>There is no folder "%1". Choose another one, or create it first.</source>
         <translation>フォルダー「%1」がありません。別のフォルダーを選ぶか、先に作成してください。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SaveAs.cpp"/>
+        <source>"%1" is open as another report. Close that one first, or choose another name.</source>
+        <translation>「%1」は別のレポートとして開かれています。先にそれを閉じるか、別の名前を選んでください。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>

@@ -9,7 +9,9 @@ namespace kareport
 enum DeskCommandId : unsigned
 {
     fileFromTemplateCommand = 33250,
-    preferencesCommand = 33251
+    preferencesCommand = 33251,
+    nextReportCommand = 33252,
+    previousReportCommand = 33253
 };
 
 } // namespace kareport

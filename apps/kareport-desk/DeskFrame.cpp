@@ -25,6 +25,8 @@
 #include <QStatusBar>
 #include <QTimer>
 
+#include <utility>
+
 namespace
 {
 
@@ -38,11 +40,21 @@ bool isOpen(const UDocument *document)
     return UApplication::Get()->IsOpen(document);
 }
 
-/// The open document of a file; null when there is none.
-UDocument *documentOf(const QString &path)
+/// Says what a file holds that its report does not show.
+void sayWhatIsNotShown(const QString &path, const kareport::ReadNotes &notes)
+{
+    if (!notes.warnings.isEmpty()) {
+        kareport::showMessage(
+            {Xlate("\"%1\" was opened, but not all of it is shown:\n\n%2").arg(path, notes.warnings.join(u'\n')),
+             QString(), MessageButtons::Ok, kareport::MessageIcon::Information});
+    }
+}
+
+/// The open document of a file; null when there is none. @param except  which is not meant
+UDocument *documentOf(const QString &path, const UDocument *except = nullptr)
 {
     for (UDocument *document : openDocuments()) {
-        if (document->GetPathName() == path) {
+        if (document != except && document->GetPathName() == path) {
             return document;
         }
     }
@@ -160,19 +172,29 @@ bool DeskFrame::OpenFile(const QString &path)
         if (reading_.contains(file)) {
             return true;
         }
-        bool isStopped = false;
-        report = openReport(file, isStopped);
-        error = report == nullptr && !isStopped ? Xlate("\"%1\" could not be opened.").arg(path) : QString();
+        kareport::ReadNotes notes;
+        report = openReport(file, notes);
+        error = report == nullptr && !notes.isStopped ? Xlate("\"%1\" could not be opened.").arg(path) : QString();
+        const bool isOpened = finishOpening(report, error);
+        sayWhatIsNotShown(path, notes);
+        return isOpened;
     }
     return finishOpening(report, error);
 }
 
-UDocument *DeskFrame::openReport(const QString &file, bool &isStopped)
+UDocument *DeskFrame::openReport(const QString &file, kareport::ReadNotes &notes)
 {
     if (UDocument *open = documentOf(file)) {
         return open;
     }
-    return read(file, [&] { return kareport::openSavedReport(file, &isStopped); });
+    UReportDoc *report = read(file, [&] { return kareport::openSavedReport(file, &notes); });
+    UDocument *other = documentOf(file, report);
+    if (report != nullptr && other != nullptr) {
+        report
+            ->OnCloseDocument(); // another report was saved into the file while it was read: they would overwrite each other
+        return other;
+    }
+    return report;
 }
 
 UReportDoc *DeskFrame::read(const QString &file, const std::function<UReportDoc *()> &open)
@@ -192,16 +214,17 @@ std::vector<kareport::KeptReport> DeskFrame::reopen(const std::vector<kareport::
     std::vector<kareport::KeptReport> notReopened;
     QStringList lost;
     bool isTextKept = false;
-    bool isStopped = false;
+    kareport::ReadNotes notes;
     for (const kareport::KeptReport &kept : left) {
-        const auto open = [&] { return kareport::Recovery::reopen(kept, &isStopped); };
-        UReportDoc *report = isStopped ? nullptr : read(kept.path, open);
+        const auto open = [&] { return kareport::Recovery::reopen(kept, &notes); };
+        UReportDoc *report = notes.isStopped ? nullptr : read(kept.path, open);
         if (report != nullptr) {
             activate(report);
+            sayWhatIsNotShown(kept.path, std::exchange(notes, {}));
             continue;
         }
         notReopened.push_back(kept);
-        if (!isStopped) {
+        if (!notes.isStopped) {
             lost.append(kept.name());
             isTextKept = isTextKept || kareport::Recovery::holdsText(kept);
         }
@@ -279,6 +302,24 @@ void DeskFrame::NoteDocumentEvent(UDocument &document, UDocument::DocumentEvent 
         Qt::QueuedConnection);
 }
 
+void DeskFrame::loadAgain(UReportDoc &report)
+{
+    const QString path = report.GetPathName();
+    kareport::ReadNotes notes;
+    const bool isLoaded = kareport::reloadSavedReport(report, &notes);
+    if (isLoaded) {
+        sayWhatIsNotShown(path, notes);
+        return;
+    }
+    if (UReportDoc::IsReportAvailable(&report)) {
+        report.SetModifiedFlag(true); // what is shown stands in no file any more
+        if (!notes.isStopped) {
+            const QString reason = kareport::whyNotOpened(path);
+            AppMessageBox(reason.isEmpty() ? Xlate("\"%1\" could not be opened.").arg(path) : reason);
+        }
+    }
+}
+
 void DeskFrame::fileChanged(const QString &path)
 {
     for (UDocument *open : openDocuments()) {
@@ -293,15 +334,8 @@ void DeskFrame::fileChanged(const QString &path)
                 : Xlate("\"%1\" was changed by another program. Load it again?");
         const MessageAnswer answer = kareport::showMessage(
             {question.arg(path), QString(), MessageButtons::YesNo, kareport::MessageIcon::Question});
-        bool isStopped = false;
-        if (answer == MessageAnswer::Yes && isOpen(document) && !kareport::reloadSavedReport(*document, &isStopped) &&
-            isOpen(document))
-        {
-            document->SetModifiedFlag(true); // what is shown stands in no file any more
-            const QString reason = kareport::whyNotOpened(path);
-            if (!isStopped) {
-                AppMessageBox(reason.isEmpty() ? Xlate("\"%1\" could not be opened.").arg(path) : reason);
-            }
+        if (answer == MessageAnswer::Yes && isOpen(document)) {
+            loadAgain(*document);
         }
         return;
     }

@@ -15,8 +15,9 @@ class UReportDoc;
 
 namespace kareport
 {
+struct ReadNotes;
 struct TemplateJob;
-}
+} // namespace kareport
 
 /// The main window of the desktop program.
 class DeskFrame : public UXTPMDIFrameWnd
@@ -63,8 +64,7 @@ private:
     void askPreferences();
     bool finishOpening(UDocument *report, const QString &error);
     /// The report of a file, which is opened where it is not open.
-    /// @param isStopped  receives whether the user has stopped that
-    UDocument *openReport(const QString &file, bool &isStopped);
+    UDocument *openReport(const QString &file, kareport::ReadNotes &notes);
     /// Opens a report in whatever way, while its file counts as being opened: what changes in it meanwhile is told.
     UReportDoc *read(const QString &file, const std::function<UReportDoc *()> &open);
     /// Opens what a program that crashed had open. @return what could not be opened, and what the user did not wait for
@@ -75,7 +75,10 @@ private:
     /// again, and so is one whose editor has been closed.
     void closeUnseen();
     void fileChanged(const QString &path);
+    void loadAgain(UReportDoc &report);
 
+    /// Brings the next report to the front, the first one after the last. @param step  1, or -1 for the one before
+    void stepReport(int step);
     void newWindow();
     void arrange(Qt::Orientation orientation);
     void cascade();

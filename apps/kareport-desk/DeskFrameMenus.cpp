@@ -24,6 +24,8 @@ std::vector<kareport::Command> DeskFrame::makeCommands()
          {},
          [](CommandState &state) { state.enabled = !UApplication::Get()->GetRecentFileList().isEmpty(); }},
         {exitCommand, [this] { close(); }, {}},
+        {nextReportCommand, [this] { stepReport(1); }, hasReport},
+        {previousReportCommand, [this] { stepReport(-1); }, hasReport},
         {windowNewCommand, [this] { newWindow(); }, hasReport},
         {windowCascadeCommand, [this] { cascade(); }, hasReport},
         {windowArrangeCommand, [this] { cascade(); }, hasReport},
@@ -71,6 +73,10 @@ void DeskFrame::makeMenus()
     AddCommand(*menu.view, zoomInCommand, Xlate("Zoom &In\tCtrl++"));
     AddCommand(*menu.view, zoomOutCommand, Xlate("Zoom &Out\tCtrl+-"));
     AddCommand(*menu.view, zoomResetCommand, Xlate("&Usual Size\tCtrl+0"));
+
+    menu.window->addSeparator();
+    AddCommand(*menu.window, nextReportCommand, Xlate("Ne&xt Report\tCtrl+Tab"));
+    AddCommand(*menu.window, previousReportCommand, Xlate("Pre&vious Report\tCtrl+Shift+Tab"));
 
     toolBar_ = addToolBar(Xlate("Toolbar"));
     toolBar_->setObjectName(QStringLiteral("toolbar"));

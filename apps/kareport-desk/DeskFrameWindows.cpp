@@ -13,6 +13,9 @@
 #include <QApplication>
 #include <QDockWidget>
 
+#include <algorithm>
+#include <cstddef>
+
 namespace
 {
 
@@ -81,6 +84,20 @@ void DeskFrame::SettlePanes()
 {
     closeUnseen();
     UXTPMDIFrameWnd::SettlePanes();
+}
+
+void DeskFrame::stepReport(int step)
+{
+    std::vector<UDocument *> shown = UApplication::Get()->GetDocuments();
+    std::erase_if(shown, [](const UDocument *document) { return !document->IsShown(); });
+    if (shown.empty()) {
+        return;
+    }
+    const auto count = static_cast<std::ptrdiff_t>(shown.size());
+    const auto current = std::find(shown.begin(), shown.end(), GetCommandDocument()) - shown.begin();
+    // From none of them, it is the first or the last.
+    const auto next = current == count ? (step > 0 ? 0 : count - 1) : (current + step + count) % count;
+    activate(shown[static_cast<std::size_t>(next)]);
 }
 
 void DeskFrame::newWindow()

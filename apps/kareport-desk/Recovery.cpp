@@ -17,6 +17,7 @@
 #include <QJsonDocument>
 #include <QJsonObject>
 #include <QStandardPaths>
+#include <QStringEncoder>
 #include <QUuid>
 
 #include <algorithm>
@@ -83,13 +84,22 @@ bool fill(UReportDoc &report, const KeptReport &kept, LoadedText &text)
     return !report.HasLostText();
 }
 
+/// Writes a report's text piece by piece: while a long one is written, the windows wait.
 bool writeAll(const UReportDoc &report, QIODevice &device)
 {
+    constexpr qint64 longestPiece = 128 * 1024; // characters
     return whileMemoryLasts(false, [&] {
-        const QString text = report.CopyText();
-        const QByteArray bytes = text.toUtf8();
-        // Without memory for a copy there is none; what was kept before is worth more.
-        return text.size() == report.GetTextLength() && device.write(bytes) == bytes.size();
+        QStringEncoder encode(QStringEncoder::Utf8);
+        const qint64 length = report.GetTextLength();
+        for (qint64 at = 0; at < length; at += longestPiece) {
+            const QString piece = report.CopyText(at, longestPiece);
+            const QByteArray bytes = encode(piece);
+            // Without memory for a copy there is none; what was kept before is worth more.
+            if (piece.size() != std::min(longestPiece, length - at) || device.write(bytes) != bytes.size()) {
+                return false;
+            }
+        }
+        return true;
     });
 }
 
@@ -204,10 +214,10 @@ bool Recovery::holdsText(const KeptReport &kept)
     return !kept.textFile.isEmpty() && RecoveryFolder(QFileInfo(kept.textFile).path()).holdsText(kept.textFile);
 }
 
-UReportDoc *Recovery::reopen(const KeptReport &kept, bool *isStopped)
+UReportDoc *Recovery::reopen(const KeptReport &kept, ReadNotes *notes)
 {
     if (kept.textFile.isEmpty()) {
-        UReportDoc *saved = openSavedReport(kept.path, isStopped);
+        UReportDoc *saved = openSavedReport(kept.path, notes);
         if (saved != nullptr && !saved->IsPageFixed()) {
             fixPage(*saved, kept);
         }
@@ -216,8 +226,8 @@ UReportDoc *Recovery::reopen(const KeptReport &kept, bool *isStopped)
     UReportDoc *report = nullptr;
     const bool isWhole = whileMemoryLasts(false, [&] {
         const TextFile read = readText(kept);
-        if (isStopped != nullptr) {
-            *isStopped = read.state == TextFile::State::Stopped;
+        if (notes != nullptr) {
+            notes->isStopped = read.state == TextFile::State::Stopped;
         }
         report = read.text ? CreateReport(kept.title, true, false, nullptr, 0, nullptr) : nullptr;
         return report != nullptr && fill(*report, kept, *read.text);

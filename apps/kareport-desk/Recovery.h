@@ -15,6 +15,8 @@ class UReportDoc;
 namespace kareport
 {
 
+struct ReadNotes;
+
 /// An open report as it is kept on the disk.
 struct KeptReport
 {
@@ -46,9 +48,9 @@ public:
 
     /// What programs that crashed had open, the reports that were opened first coming first.
     std::vector<KeptReport> leftReports() const;
-    /// Opens one of them again, with what was not saved. @param isStopped  receives whether the user has stopped it; may be
-    /// null. @return null when it cannot be opened, there is no memory for it, or it was stopped
-    static UReportDoc *reopen(const KeptReport &kept, bool *isStopped = nullptr);
+    /// Opens one of them again, with what was not saved. @param notes  may be null
+    /// @return null when it cannot be opened, there is no memory for it, or the user has stopped it
+    static UReportDoc *reopen(const KeptReport &kept, ReadNotes *notes = nullptr);
     /// Whether the text of one of them is still there.
     static bool holdsText(const KeptReport &kept);
     /// Folders of programs that crashed whose lists cannot be read. They stay as they are.

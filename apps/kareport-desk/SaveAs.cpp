@@ -1,10 +1,12 @@
 #include "SaveAs.h"
 
 #include "AppMessageBox.h"
+#include "FileIdentity.h"
 #include "PdfExport.h"
 #include "PdfFile.h"
 #include "ReplaceFile.h"
 #include "ReportSaveName.h"
+#include "UApplication.h"
 #include "UReportDoc.h"
 #include "WaitCursor.h"
 #include "Xlate.h"
@@ -54,8 +56,24 @@ bool hasFolder(const QString &path, const SaveRequest &request)
     return false;
 }
 
+/// Whether another report that is open has a file for its own: the two would overwrite each other.
+bool isOpenElsewhere(const QString &path, const SaveRequest &request)
+{
+    const QString identity = fileIdentity(path);
+    const std::vector<UDocument *> open = UApplication::Get()->GetDocuments();
+    return !identity.isEmpty() && std::any_of(open.begin(), open.end(), [&](const UDocument *document) {
+        return document != request.document && !document->GetPathName().isEmpty() &&
+               fileIdentity(document->GetPathName()) == identity;
+    });
+}
+
 bool mayReplace(const QString &path, const SaveRequest &request)
 {
+    if (isOpenElsewhere(path, request)) {
+        showMessage({Xlate("\"%1\" is open as another report. Close that one first, or choose another name.").arg(path),
+                     QString(), MessageButtons::Ok, MessageIcon::Information});
+        return false;
+    }
     if ((request.flags & SaveRequest::overwritePrompt) == 0 || !QFileInfo::exists(path)) {
         return true;
     }

@@ -1,10 +1,13 @@
 #include "SavedReports.h"
 
+#include "InputError.h"
+#include "LineEndings.h"
 #include "LoadedText.h"
 #include "MemoryLasts.h"
 #include "PdfFile.h"
 #include "ReportContent.h"
 #include "ReportEntry.h"
+#include "RichTextReader.h"
 #include "SavedText.h"
 #include "TextFile.h"
 #include "UReportDoc.h"
@@ -12,6 +15,7 @@
 
 #include <QFile>
 #include <QFileInfo>
+#include <QTextDocument>
 
 #include <optional>
 
@@ -33,14 +37,20 @@ TextFile readReportFile(const QString &path, UserInput input)
 
 /// The pages of a report that was loaded byte by byte, or as rich text, are those that it was written in, whatever a page
 /// would be measured to now. What counts is what it shows.
-UReportDoc *withPageLength(UReportDoc *report)
+/// @return what it does not show
+QStringList keepPageLength(UReportDoc &report)
 {
-    if (report != nullptr) {
-        if (const auto lines = linesOfPages(shownPlainText(*report))) {
-            report->FixPage(lines, std::nullopt);
-        }
+    QTextDocument shown;
+    RichTextNotes passedOver;
+    const auto wrong = showReportContent(report, shown, &passedOver);
+    if (const auto lines = linesOfPages(withCrLf(shown.toPlainText()))) {
+        report.FixPage(lines, std::nullopt);
     }
-    return report;
+    QStringList warnings = passedOver.texts();
+    if (wrong) {
+        warnings.append(InputError{QFileInfo(report.GetPathName()).fileName(), wrong->place, wrong->text}.message());
+    }
+    return warnings;
 }
 
 /// @return whether the report has all of the text
@@ -74,14 +84,14 @@ void forgetPageLengthOfText(UReportDoc &report)
     }
 }
 
-bool reload(UReportDoc &report, bool &isStopped)
+bool reload(UReportDoc &report, ReadNotes &notes)
 {
     if (!whyNotOpened(report.GetPathName()).isEmpty() || !QFile(report.GetPathName()).open(QIODevice::ReadOnly)) {
         return false; // what is shown is then all that there is
     }
     // What the user types until the file has been read would go with the text before it.
     const TextFile read = readReportFile(report.GetPathName(), UserInput::Kept);
-    isStopped = read.state == TextFile::State::Stopped;
+    notes.isStopped = read.state == TextFile::State::Stopped;
     const bool isRead = read.state == TextFile::State::Whole || read.state == TextFile::State::OtherText;
     if (!isRead || !UReportDoc::IsReportAvailable(&report)) {
         return false;
@@ -93,7 +103,7 @@ bool reload(UReportDoc &report, bool &isStopped)
     }
     report.Clear();
     const bool isLoaded = report.OnOpenDocument(report.GetPathName());
-    withPageLength(&report);
+    notes.warnings = keepPageLength(report);
     report.UpdateAllViews(nullptr, 0, nullptr);
     return isLoaded;
 }
@@ -112,18 +122,22 @@ QString whyNotOpened(const QString &path)
     return isPdfFile(path) ? Xlate("A PDF cannot be opened as a report") : QString();
 }
 
-UReportDoc *openSavedReport(const QString &path, bool *isStopped)
+UReportDoc *openSavedReport(const QString &path, ReadNotes *notes)
 {
+    ReadNotes unasked;
+    ReadNotes &said = notes != nullptr ? *notes : unasked;
     if (!whyNotOpened(path).isEmpty()) {
         return nullptr;
     }
     const TextFile read = readReportFile(path, UserInput::Taken);
-    if (isStopped != nullptr) {
-        *isStopped = read.state == TextFile::State::Stopped;
-    }
+    said.isStopped = read.state == TextFile::State::Stopped;
     if (read.state == TextFile::State::OtherText) {
-        return withPageLength(
-            dynamic_cast<UReportDoc *>(GetReportTemplate()->OpenReportDocumentFile(path, 1, 1, nullptr, 0, nullptr)));
+        auto *other =
+            dynamic_cast<UReportDoc *>(GetReportTemplate()->OpenReportDocumentFile(path, 1, 1, nullptr, 0, nullptr));
+        if (other != nullptr) {
+            said.warnings = keepPageLength(*other);
+        }
+        return other;
     }
     UReportDoc *report = read.text ? CreateReport(QString(), true, false, nullptr, 0, nullptr) : nullptr;
     if (report != nullptr) {
@@ -137,12 +151,12 @@ UReportDoc *openSavedReport(const QString &path, bool *isStopped)
     return report;
 }
 
-bool reloadSavedReport(UReportDoc &report, bool *isStopped)
+bool reloadSavedReport(UReportDoc &report, ReadNotes *notes)
 {
-    bool wasStopped = false;
-    const bool isLoaded = whileMemoryLasts(false, [&] { return reload(report, wasStopped); });
-    if (isStopped != nullptr) {
-        *isStopped = wasStopped;
+    ReadNotes said;
+    const bool isLoaded = whileMemoryLasts(false, [&] { return reload(report, said); });
+    if (notes != nullptr) {
+        *notes = said;
     }
     return isLoaded;
 }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QString>
+#include <QStringList>
 
 class UReportDoc;
 
@@ -9,13 +10,20 @@ namespace kareport
 
 /// Why a file cannot be opened; empty when it may be tried. Reading a pipe or a device might never end.
 QString whyNotOpened(const QString &path);
+/// What is to be said of a file that was read.
+struct ReadNotes
+{
+    bool isStopped = false; ///< by the user; nothing more is to be said
+    QStringList warnings;   ///< sentences about what the file holds and the report does not show
+};
+
 /// Opens a saved report in a pane. The windows answer while a long file is read: the report is there once it has been.
-/// @param isStopped  receives whether the user has stopped it; may be null
+/// @param notes  may be null
 /// @return null when it cannot be opened or was stopped
-UReportDoc *openSavedReport(const QString &path, bool *isStopped = nullptr);
-/// Replaces what a report holds by its file. @param isStopped  as above
+UReportDoc *openSavedReport(const QString &path, ReadNotes *notes = nullptr);
+/// Replaces what a report holds by its file. @param notes  may be null
 /// @return false, with the report as it was, when the file cannot be read or that was stopped; the report may have been
 /// closed meanwhile
-bool reloadSavedReport(UReportDoc &report, bool *isStopped = nullptr);
+bool reloadSavedReport(UReportDoc &report, ReadNotes *notes = nullptr);
 
 } // namespace kareport

@@ -15,6 +15,7 @@ using kareport::Recovery;
 
 constexpr qsizetype longText = qsizetype(4) << 20;
 constexpr std::size_t ofThatSize = std::size_t(2) << 20;
+constexpr std::size_t ofAPiece = std::size_t(128) << 10; // of a text that is written piece by piece
 
 void put(const QString &path, const QByteArray &content)
 {
@@ -52,7 +53,7 @@ TEST(RecoveryAllocations, AReportIsOpenedAgainWholeOrNotAtAll)
         }
         return hasFailed && !testing::Test::HasFailure();
     });
-    EXPECT_GE(allocations, 3) << "the bytes, their characters, and the text of the report";
+    EXPECT_GE(allocations, 1) << "the text of the report";
 }
 
 TEST(RecoveryAllocations, WithoutMemoryTheTextThatWasKeptBeforeStays)
@@ -73,7 +74,7 @@ TEST(RecoveryAllocations, WithoutMemoryTheTextThatWasKeptBeforeStays)
         bool isKept = true;
         bool hasFailed = false;
         {
-            const FailingAllocation failing(number, ofThatSize);
+            const FailingAllocation failing(number, ofAPiece);
             EXPECT_NO_THROW(isKept = recovery.keep()) << number;
             hasFailed = failing.hasFailed();
         }
@@ -85,7 +86,7 @@ TEST(RecoveryAllocations, WithoutMemoryTheTextThatWasKeptBeforeStays)
         EXPECT_TRUE(before == report->CopyText().toUtf8()) << number;
         return hasFailed && !testing::Test::HasFailure();
     });
-    EXPECT_GE(allocations, 2) << "the copy and its bytes";
+    EXPECT_GE(allocations, 2) << "a copy of a piece, and its bytes";
     report->OnCloseDocument();
 }
 
@@ -100,6 +101,7 @@ TEST(RecoveryAllocations, AFileThatIsLoadedAgainWithoutMemoryIsNotTakenForLoaded
     EXPECT_GE(failingEachAllocation([&](qint64 number) {
                   bool isLoaded = false;
                   bool hasFailed = false;
+                  report->SetData(QStringLiteral("old"));
                   {
                       const FailingAllocation failing(number, ofThatSize);
                       EXPECT_NO_THROW(isLoaded = kareport::reloadSavedReport(*report)) << number;
