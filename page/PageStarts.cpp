@@ -111,7 +111,7 @@ bool PageStarts::wantsRemoved(qint64 at, qint64 removed, qint64 inserted) const
         return false;
     }
     const auto first = std::lower_bound(positions_.begin(), positions_.end(), at);
-    return inserted > 0 || (first != positions_.end() && *first <= at + removed);
+    return inserted > 0 || removed > shortestHeader || (first != positions_.end() && *first <= at + removed);
 }
 
 PageStarts::Edit PageStarts::prepare(qint64 at, qint64 removed, QStringView removedText, QStringView inserted,
@@ -143,7 +143,9 @@ PageStarts::Edit PageStarts::prepare(qint64 at, qint64 removed, QStringView remo
     if (!beginsLine && !headers.empty() && headers.front() == 0) {
         headers.erase(headers.begin()); // the end of one
     }
-    if (!records_.empty() || !record.before.empty() || !headers.empty()) {
+    // The line of a page header may begin no page: it stays so when its removal is undone.
+    const bool removesHeaders = !pageHeadersIn(changed.removed).empty();
+    if (!records_.empty() || !record.before.empty() || !headers.empty() || removesHeaders) {
         record.removed = Piece::of(changed.removed);
         record.inserted = Piece::of(changed.inserted);
     }
@@ -164,7 +166,7 @@ PageStarts::Edit PageStarts::prepare(qint64 at, qint64 removed, QStringView remo
     }
     sortOut(edit.middle);
 
-    if (!record.before.empty() || !record.after.empty()) {
+    if (!record.before.empty() || !record.after.empty() || removesHeaders) {
         edit.record = std::move(record);
         records_.reserve(mostRecords + 1);
     }

@@ -55,7 +55,7 @@ private:
         static Piece of(QStringView text);
         bool operator==(const Piece &other) const = default;
     };
-    /// An edit that starts were touched by: where they were before and after it, counted from its place.
+    /// An edit that starts were touched by, or that could bring them: where they were before and after it, counted from its place.
     struct Record
     {
         qint64 at = 0;

@@ -145,6 +145,18 @@ TEST(PageStarts, EditsAreTakenBackOneAfterTheOther)
     EXPECT_EQ(text.positions(), threeStarts);
 }
 
+TEST(PageStarts, AHeaderLineThatBeginsNoPageComesBackAsThat)
+{
+    const QString second = header(2);
+    StartedText text(QStringLiteral("1a.\r\n") + second + QStringLiteral("2a.\r\n"), {0});
+    text.replace(5, second.size(), QString());
+    text.replace(5, 0, second);
+    EXPECT_EQ(text.positions(), Positions({0})) << "undone";
+    text.replace(5, second.size(), QString());
+    text.replace(0, 0, second);
+    EXPECT_EQ(text.positions(), Positions({0, second.size()})) << "pasted elsewhere";
+}
+
 TEST(PageStarts, TwoLikePiecesAtOnePlaceComeBackOneAfterTheOther)
 {
     StartedText text(QStringLiteral("1a.\r\n\r\n\r\n2a.\r\n"), {0, 5});

@@ -22,13 +22,22 @@
 
 #include <memory>
 
-/// Fixes what reports depend on (preferences, clock, printer) for one test and puts it back afterwards.
+/// Fixes what reports depend on (preferences, clock, printer) for one test and puts it back afterwards: when the last of
+/// several has gone.
 class FixedSurroundings
 {
 public:
-    FixedSurroundings() { fix(); }
+    FixedSurroundings()
+    {
+        if (++count_ == 1) {
+            fix();
+        }
+    }
     ~FixedSurroundings()
     {
+        if (--count_ > 0) {
+            return;
+        }
         // The flag is one for all reports and outlives the preferences that it was read from.
         WriteProfileString(QString(), QStringLiteral("ReportPrintHash"), QStringLiteral("0"));
         {
@@ -53,6 +62,8 @@ private:
         kareport::fixTime(QDateTime(QDate(2024, 3, 5), QTime(14, 7)));
         kareport::setDefaultPrinter({kareport::PrinterSource::BuiltIn, kareport::PaperSize::A4, 600});
     }
+
+    static inline int count_ = 0;
 };
 
 /// A text whose lines end with LF, as a report ends them.

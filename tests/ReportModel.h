@@ -194,7 +194,7 @@ public:
         if (isUndo) {
             history_.erase(std::next(undone).base());
         }
-        if (!change.before.empty() || !change.after.empty()) {
+        if (!change.before.empty() || !change.after.empty() || !headersIn(change.removed).empty()) {
             history_.push_back(change);
         }
     }

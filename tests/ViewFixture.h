@@ -32,12 +32,13 @@ public:
     ShownReport(const ShownReport &) = delete;
     ShownReport &operator=(const ShownReport &) = delete;
 
-    /// Opens another view of the report.
-    UReportView &open()
+    /// Opens another view of the report. @param inPieces  whether it loads long texts in pieces
+    UReportView &open(bool inPieces = false)
     {
         auto *pane = new CViewPane;
         panes_.push_back(pane);
         UReportView *view = showIn<UReportView>(*pane, report);
+        view->SetLoadsInPieces(inPieces);
         view->OnInitialUpdate();
         view->GetWidget()->resize(640, 400);
         view->GetWidget()->show();

@@ -101,7 +101,8 @@ Outcome Supervisor::run(const Steps &steps)
         const QStringList lines = done.split(u'\n', Qt::SkipEmptyParts);
         outcome.step = static_cast<std::size_t>(lines.size());
         outcome.done = lines.mid(std::max<qsizetype>(0, lines.size() - 40)).join(u'\n');
-        if (worker.exitStatus() == QProcess::NormalExit && worker.exitCode() == workerIsDone) {
+        const bool hasEnded = worker.error() != QProcess::FailedToStart;
+        if (hasEnded && worker.exitStatus() == QProcess::NormalExit && worker.exitCode() == workerIsDone) {
             return outcome;
         }
         if (!isStuck && worker.exitStatus() == QProcess::CrashExit &&
@@ -111,7 +112,8 @@ Outcome Supervisor::run(const Steps &steps)
         }
         outcome.isViolated = true;
         const QString violation = readAll(folder.filePath(violationName));
-        outcome.what = isStuck ? QStringLiteral("the program hangs")
+        outcome.what = !hasEnded ? QStringLiteral("the program cannot be started")
+                       : isStuck ? QStringLiteral("the program hangs")
                        : !violation.isEmpty()
                            ? violation
                            : QStringLiteral("the program died (%1)\n%2").arg(worker.exitCode()).arg(said.right(6000));

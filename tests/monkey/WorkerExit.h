@@ -5,8 +5,9 @@
 namespace monkey
 {
 
-/// How a worker says what came of its steps: by its status, and by files in its folder.
-constexpr int workerIsDone = 0;
+/// How a worker says what came of its steps: by its status, and by files in its folder. None of these is what a program
+/// that could not be started, or was ended by somebody else, ends with.
+constexpr int workerIsDone = 11;
 constexpr int workerHasFound = 10;
 inline const QString stepsName = QStringLiteral("steps");
 inline const QString doneName = QStringLiteral("done");

@@ -1,0 +1,76 @@
+#pragma once
+
+#include <QString>
+
+#include <iterator>
+
+// Steps of hosts and of users with reports and their views, for random tests.
+
+enum class ReportOp
+{
+    // of a host
+    WriteLine,
+    Write,
+    LineFeed,
+    NewPage,
+    Table,
+    Heading,
+    HeaderFlag,
+    LinesPerPage,
+    SetData,
+    Clear,
+    RichText,
+    // of users, in view `a`
+    Type,
+    LineEnd,
+    Backspace,
+    Delete,
+    Cut,
+    Paste,
+    TypeOver,
+    Undo,
+    Redo,
+    TakeAll,
+    OpenView,
+    CloseView,
+    // of both
+    Reload,
+    // of what is opened and closed, and of what goes on by itself
+    HidePane,
+    ShowPane,
+    WriteUnseen,
+    SetLongData,
+    GoOn,
+    NeedAll,
+    OpenReport,
+    CloseReport,
+    count
+};
+
+inline constexpr const char *reportOpNames[] = {
+    "WriteLine", "Write",    "LineFeed",    "NewPage",     "Table",   "Heading",   "HeaderFlag", "LinesPerPage",
+    "SetData",   "Clear",    "RichText",    "Type",        "LineEnd", "Backspace", "Delete",     "Cut",
+    "Paste",     "TypeOver", "Undo",        "Redo",        "TakeAll", "OpenView",  "CloseView",  "Reload",
+    "HidePane",  "ShowPane", "WriteUnseen", "SetLongData", "GoOn",    "NeedAll",   "OpenReport", "CloseReport"};
+static_assert(std::size(reportOpNames) == std::size_t(ReportOp::count));
+
+/// What the numbers mean is brought into what there is, so that every step makes sense in every state.
+struct ReportStep
+{
+    ReportOp op;
+    int a;
+    int b;
+    int c;
+    int report = 0; ///< which of those that are open
+};
+
+/// A step as a row of a test.
+inline QString textOf(const ReportStep &step)
+{
+    return QStringLiteral("    {ReportOp::%1, %2, %3, %4, %5},\n")
+        .arg(QLatin1StringView(reportOpNames[int(step.op)]))
+        .arg(step.a)
+        .arg(step.b)
+        .arg(step.c)
+        .arg(step.report);
+}
