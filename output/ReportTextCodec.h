@@ -1,6 +1,7 @@
 #pragma once
 
 #include "KaReportExport.h"
+#include "TextOutlet.h"
 
 #include <QLatin1StringView>
 #include <QStringView>
@@ -47,15 +48,15 @@ private:
 inline constexpr char reportFileMark[] = {'\xEF', '\xBB', '\xBF'};
 
 /// Writes report text to an open device as it comes.
-class KAREPORT_EXPORT ReportTextWriter
+class KAREPORT_EXPORT ReportTextWriter : public TextOutlet
 {
 public:
     /// The device must live as long as the writer.
     ReportTextWriter(QIODevice &device, LineEnds lineEnds) : device_(device), encoder_(lineEnds), lineEnds_(lineEnds) {}
 
     /// Writes what comes next in the text. @return false once a write has failed; what comes then is passed over
-    bool write(QStringView text);
-    bool write(QLatin1StringView text);
+    bool write(QStringView text) override;
+    bool write(QLatin1StringView text) override;
     /// Ends the text. @return whether all of it was written
     bool finish();
 

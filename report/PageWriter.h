@@ -4,7 +4,7 @@
 #include "MemoryLasts.h"
 #include "PageStarts.h"
 #include "ReportText.h"
-#include "ReportTextCodec.h"
+#include "TextOutlet.h"
 
 #include <QString>
 #include <QStringView>
@@ -54,7 +54,7 @@ public:
 
     /// Hands the text on while it is written, so that `text` never holds more than its end; null keeps the text. The outlet
     /// must live until another one, or null, is set. `clear` does not take back what was handed on.
-    void setOutlet(ReportTextWriter *outlet) { outlet_ = outlet; }
+    void setOutlet(TextOutlet *outlet) { outlet_ = outlet; }
     /// Hands on what is left. @return whether all of the text was taken
     bool emptyIntoOutlet();
 
@@ -153,7 +153,7 @@ private:
     PageWriterObserver *observer_;
     ReportText text_;
     PageStarts starts_;
-    ReportTextWriter *outlet_ = nullptr;
+    TextOutlet *outlet_ = nullptr;
     quint64 losses_ = 0;
     int lineNumber_ = 0;
     qint64 lineCount_ = 0; ///< a report that is handed on may have any number

@@ -2,6 +2,7 @@
 
 #include "LimitedMemory.h"
 #include "PrintQt.h"
+#include "ReportTextCodec.h"
 
 #include <QBuffer>
 
