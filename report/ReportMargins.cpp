@@ -1,6 +1,6 @@
 #include "ReportMargins.h"
 
-#include "TemplateText.h"
+#include "LeadingInteger.h"
 
 #include <QStringList>
 

@@ -2,6 +2,7 @@
 
 #include "ApplicationTitle.h"
 #include "Clock.h"
+#include "LeadingInteger.h"
 #include "MemoryLasts.h"
 #include "PageHeader.h"
 #include "Preferences.h"
@@ -9,7 +10,6 @@
 #include "ReportExit.h"
 #include "ReportMargins.h"
 #include "ReportWindow.h"
-#include "TemplateText.h"
 #include "UPreviewDlg.h"
 #include "Xlate.h"
 

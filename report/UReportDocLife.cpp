@@ -5,7 +5,7 @@
 #include "ReportExit.h"
 #include "ReportViews.h"
 #include "ReportWindow.h"
-#include "TemplateText.h"
+#include "TextFolding.h"
 #include "UDocTemplate.h"
 #include "UView.h"
 

@@ -3,7 +3,7 @@
 #include "CViewPane.h"
 #include "RememberedView.h"
 #include "ReportWindow.h"
-#include "TemplateText.h"
+#include "TextFolding.h"
 
 void UReportDoc::SetReportWindowActive()
 {

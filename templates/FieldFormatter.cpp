@@ -2,6 +2,7 @@
 
 #include "FixedNotation.h"
 #include "Is_Zero.h"
+#include "TextFolding.h"
 #include "UFormatAngle.h"
 #include "UFormatBearing.h"
 #include "UPointNumber.h"

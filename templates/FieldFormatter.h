@@ -1,7 +1,7 @@
 #pragma once
 
+#include "FieldMarker.h"
 #include "KaReportExport.h"
-#include "TemplateText.h"
 #include "TextBuffer.h"
 #include "UJobSettings.h"
 #include "sXmlReportField.h"

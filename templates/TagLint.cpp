@@ -1,6 +1,6 @@
 #include "TagLint.h"
 
-#include "TemplateText.h"
+#include "TextFolding.h"
 
 #include <algorithm>
 #include <array>

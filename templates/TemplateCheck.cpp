@@ -1,9 +1,11 @@
 #include "TemplateCheck.h"
 
+#include "FieldMarker.h"
+#include "LeadingInteger.h"
 #include "TagLint.h"
 #include "TemplateElements.h"
 #include "TemplateRecords.h"
-#include "TemplateText.h"
+#include "TextFolding.h"
 #include "VariableType.h"
 #include "Xlate.h"
 

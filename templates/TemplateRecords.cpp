@@ -1,6 +1,7 @@
 #include "TemplateRecords.h"
 
-#include "TemplateText.h"
+#include "LeadingInteger.h"
+#include "TextFolding.h"
 
 #include <algorithm>
 

@@ -1,7 +1,8 @@
 #include "UXmlReportTable.h"
 
+#include "FieldMarker.h"
 #include "MemoryLasts.h"
-#include "TemplateText.h"
+#include "TextFolding.h"
 
 #include <algorithm>
 

@@ -1,10 +1,11 @@
 #include "UXmlReportTpl.h"
 
+#include "LeadingInteger.h"
 #include "MemoryLasts.h"
 #include "TemplateElements.h"
 #include "TemplateFile.h"
 #include "TemplateRecords.h"
-#include "TemplateText.h"
+#include "TextFolding.h"
 #include "VariableType.h"
 
 #include <algorithm>

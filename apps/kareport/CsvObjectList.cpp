@@ -1,7 +1,7 @@
 #include "CsvObjectList.h"
 
 #include "EntryOrder.h"
-#include "TemplateText.h"
+#include "TextFolding.h"
 #include "WideVectors.h"
 #include "Xlate.h"
 

@@ -1,6 +1,6 @@
 #include "JsonObjectList.h"
 
-#include "TemplateText.h"
+#include "TextFolding.h"
 #include "Xlate.h"
 
 #include <QSet>

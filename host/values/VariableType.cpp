@@ -1,6 +1,6 @@
 #include "VariableType.h"
 
-#include "TemplateText.h"
+#include "TextFolding.h"
 
 #include <array>
 

@@ -1,0 +1,20 @@
+#pragma once
+
+#include "KaReportExport.h"
+
+#include <QStringView>
+
+namespace kareport
+{
+
+/// Variable names that stand for something other than a variable.
+enum class FieldMarker
+{
+    None,
+    Filler,    ///< "FILLER": blanks of the field's width
+    SuffixR,   ///< "SUFFIX_R": the next field gets the suffix "R"
+    SuffixPlus ///< "SUFFIX_+": the next field gets the suffix "+"
+};
+KAREPORT_EXPORT FieldMarker fieldMarker(QStringView variableName);
+
+} // namespace kareport
