@@ -1,7 +1,7 @@
 #include "CommandSetup.h"
 
-#include "Interrupt.h"
 #include "OutputKind.h"
+#include "Signals.h"
 #include "Xlate.h"
 
 #include <QGuiApplication>

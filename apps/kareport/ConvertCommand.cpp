@@ -11,6 +11,7 @@
 #include "ReportTextDecoder.h"
 #include "RichTextReader.h"
 #include "SavedText.h"
+#include "TerminalProgress.h"
 #include "Xlate.h"
 
 #include <QJsonArray>
@@ -129,7 +130,7 @@ ExitStatus ConvertCommand::run(int &argc, char **argv) const
     }
     job.page.charsPerRow = job.page.charsPerRow.value_or(PageGeometry().charsPerRow);
     const auto application = startQt(argc, argv, JobRunner::needsFonts(job) || needsFonts(job.outputs));
-    Progress bar(progress);
+    TerminalProgress bar(progress);
     JobRunner runner(job, source, bar);
     error = runner.run();
     if (error) {

@@ -13,8 +13,6 @@
 namespace kareport
 {
 
-/// Finds the variable of a column: its parser, or nothing when the dictionary does not know the name.
-using FindVariable = std::function<std::optional<ValueParser>(const QString &name)>;
 /// Is told now and then how many bytes have been read. @return false to stop
 using ReadProgress = std::function<bool(std::size_t bytes)>;
 

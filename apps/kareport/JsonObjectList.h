@@ -1,7 +1,8 @@
 #pragma once
 
-#include "CsvObjectList.h"
 #include "JsonNode.h"
+#include "UDataObject.h"
+#include "ValueParser.h"
 
 namespace kareport
 {

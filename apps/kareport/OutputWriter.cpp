@@ -58,7 +58,6 @@ private:
             return std::nullopt;
         }
         if (isOutputReaderGone()) {
-            endByClosedReader();
             return QString();
         }
         return Xlate("the report could not be written to standard output: %1")

@@ -3,6 +3,7 @@
 #include "Interrupt.h"
 #include "OutputWriter.h"
 #include "PdfFile.h"
+#include "Signals.h"
 #include "Xlate.h"
 
 #include <algorithm>
@@ -60,6 +61,9 @@ ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, 
         }
         QStringList warnings;
         const auto error = writeOutput(report, output, progress, warnings);
+        if (error && error->isEmpty()) {
+            endByClosedReader();
+        }
         progress.finish();
         if (error && isInterrupted()) {
             return stoppedBefore(output);

@@ -1,6 +1,6 @@
 #include "Commands.h"
 
-#include "Progress.h"
+#include "TerminalProgress.h"
 #include "VisibleText.h"
 
 #include <QStringList>

@@ -8,17 +8,12 @@
 namespace kareport
 {
 
-/// Takes what is shown of any progress off standard error, so that something else can be printed.
-void eraseProgress();
-/// Whether there is something to take off. A signal's handler may ask.
-bool isProgressShown();
-
-/// Shows how far long work has come: on standard error, unless something else does.
+/// Is told how far long work has come. How that is shown is a matter of whoever derives from it; as it is, nothing is.
 class Progress
 {
 public:
     explicit Progress(bool shown) : shown_(shown) {}
-    virtual ~Progress() { Progress::finish(); }
+    virtual ~Progress() = default;
     Progress(const Progress &) = delete;
     Progress &operator=(const Progress &) = delete;
 
@@ -31,11 +26,12 @@ public:
     void advance(std::size_t done);
     /// The same for work whose amount shows only on the way.
     void advance(std::size_t done, std::size_t total);
-    /// Ends a piece of work: the line goes, unless the work is one of many.
-    virtual void finish();
+    /// Ends a piece of work.
+    virtual void finish() {}
 
 protected:
-    virtual void show(std::size_t done);
+    virtual void show(std::size_t /*done*/) {}
+    const QString &prefix() const { return prefix_; }
     const QString &what() const { return what_; }
     std::size_t total() const { return total_; }
 

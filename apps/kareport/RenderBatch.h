@@ -2,6 +2,7 @@
 
 #include "Commands.h"
 #include "RenderJob.h"
+#include "TerminalProgress.h"
 
 #include <QHash>
 
@@ -27,7 +28,7 @@ private:
     void sayWhatWasDone(qsizetype jobs) const;
 
     const RenderCommand &command_;
-    Progress progress_;
+    TerminalProgress progress_;
     QHash<QString, QString> writers_; ///< identities of files that were written, jobs that wrote them
     QHash<QString, QString> kept_;    ///< identities and names of the batch's own files
     qsizetype made_ = 0;

@@ -5,6 +5,7 @@
 #include "RenderBatch.h"
 #include "RenderJob.h"
 #include "SizeLimit.h"
+#include "TerminalProgress.h"
 #include "UpToDate.h"
 #include "Xlate.h"
 
@@ -97,7 +98,7 @@ ExitStatus RenderCommand::run(int &argc, char **argv) const
         return exitDone;
     }
     const auto application = startQt(argc, argv, job.needsFonts());
-    Progress bar(progress);
+    TerminalProgress bar(progress);
     return job.run(bar);
 }
 

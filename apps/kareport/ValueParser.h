@@ -5,6 +5,8 @@
 
 #include <QString>
 
+#include <functional>
+#include <optional>
 #include <string_view>
 
 namespace kareport
@@ -56,6 +58,9 @@ private:
     unsigned id_;
     double factor_;
 };
+
+/// Finds the variable of a column: its parser, or nothing when the dictionary does not know the name.
+using FindVariable = std::function<std::optional<ValueParser>(const QString &name)>;
 
 /// A number as data files write it, INF and NAN among them; blanks around it and one sign are allowed.
 bool parseNumber(std::string_view text, double &number);

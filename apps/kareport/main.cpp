@@ -1,7 +1,7 @@
 #include "Commands.h"
-#include "Interrupt.h"
 #include "OutputKind.h"
 #include "ProcessSetup.h"
+#include "Signals.h"
 
 #include <CLI/CLI.hpp>
 

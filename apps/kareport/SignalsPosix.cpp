@@ -1,6 +1,7 @@
-#include "Interrupt.h"
+#include "Signals.h"
 
-#include "Progress.h"
+#include "Interrupt.h"
+#include "TerminalProgress.h"
 #include "UnfinishedFile.h"
 
 #include <atomic>
@@ -18,7 +19,6 @@ namespace
 
 constexpr long patience = 200'000'000; ///< nanoseconds that work has for coming to a safe point
 
-std::atomic<bool> interrupted{false};
 std::atomic<int> interruptingSignal{0};
 std::atomic<bool> hasTimer{false};
 timer_t timer;
@@ -55,7 +55,7 @@ extern "C" void noteInterrupt(int signal)
     if (!interruptingSignal.compare_exchange_strong(none, signal) || !hasTimer) {
         endAtOnce(signal);
     }
-    interrupted = true;
+    setInterrupted(true);
     const itimerspec once = {{0, 0}, {0, patience}};
     timer_settime(timer, 0, &once, nullptr);
 }
@@ -97,16 +97,6 @@ void catchInterrupts()
         handle(signal, noteInterrupt);
     }
     handle(SIGPIPE, endForClosedReader);
-}
-
-bool isInterrupted()
-{
-    return interrupted;
-}
-
-void setInterrupted(bool isSet)
-{
-    interrupted = isSet;
 }
 
 void endByInterrupt()
