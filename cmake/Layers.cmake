@@ -22,16 +22,62 @@ if(KAREPORT_COVERAGE)
     target_link_options(ka_options INTERFACE --coverage)
 endif()
 
-# ka_layer(<target> LINKS <targets...> HEADERS <public...> PRIVATE_HEADERS <own...> SOURCES <...>)
-# HEADERS are installed; PRIVATE_HEADERS serve the layers above inside this project only.
+# ka_layer(<target> LINKS <targets...> USES <libraries...> HEADERS <public...> PRIVATE_HEADERS <own...> SOURCES <...>)
+#
+# A folder of the module or of the host. LINKS are the layers below and what the headers need of other libraries; USES is
+# what the sources alone need. HEADERS are installed; PRIVATE_HEADERS serve the layers above inside this project only.
+#
+# Three targets are made, as the same code is linked in two ways:
+#   <target>_api      the headers of this layer and of those below it; nothing is linked by it
+#   <target>_objects  the compiled sources, which the shared library is made of
+#   <target>          the layer and those below it as static libraries, for what must see more than the shared libraries
+#                     offer: tests and benchmarks
 function(ka_layer target)
-    cmake_parse_arguments(arg "" "" "LINKS;HEADERS;PRIVATE_HEADERS;SOURCES" ${ARGN})
-    add_library(${target} STATIC ${arg_SOURCES})
+    cmake_parse_arguments(arg "" "" "LINKS;USES;HEADERS;PRIVATE_HEADERS;SOURCES" ${ARGN})
+    ka_apis(apis ${arg_LINKS})
+    add_library(${target}_api INTERFACE)
+    target_include_directories(${target}_api INTERFACE ${CMAKE_CURRENT_SOURCE_DIR})
+    target_link_libraries(${target}_api INTERFACE ${apis})
+
+    add_library(${target}_objects OBJECT ${arg_SOURCES})
+    target_compile_definitions(${target}_objects PRIVATE KAREPORT_BUILDING)
+    target_link_libraries(${target}_objects PUBLIC ${target}_api ${arg_USES} PRIVATE ka_options ka_hardening)
+
+    add_library(${target} STATIC)
+    target_link_libraries(${target} PUBLIC ${target}_objects ${target}_api ${arg_LINKS} ${arg_USES})
     target_sources(${target} PUBLIC FILE_SET HEADERS BASE_DIRS ${CMAKE_CURRENT_SOURCE_DIR}
                    FILES ${arg_HEADERS} ${arg_PRIVATE_HEADERS})
-    target_include_directories(${target} PUBLIC ${CMAKE_CURRENT_SOURCE_DIR})
-    target_compile_definitions(${target} PRIVATE KAREPORT_BUILDING)
-    target_link_libraries(${target} PUBLIC ${arg_LINKS} PRIVATE ka_options ka_hardening)
     list(TRANSFORM arg_HEADERS PREPEND ${CMAKE_CURRENT_SOURCE_DIR}/)
     set_property(TARGET ${target} PROPERTY KA_INSTALLED_HEADERS ${arg_HEADERS})
 endfunction()
+
+# ka_outer_layer(<target> LINKS <targets...> HEADERS <...> SOURCES <...>)
+#
+# A folder around the module, which the programs share: a static library. It sees the headers of the layers that it names,
+# and is linked with the module as the program at the end wants it (ka_module).
+function(ka_outer_layer target)
+    cmake_parse_arguments(arg "" "" "LINKS;HEADERS;SOURCES" ${ARGN})
+    ka_apis(apis ${arg_LINKS})
+    add_library(${target} STATIC ${arg_SOURCES})
+    target_sources(${target} PUBLIC FILE_SET HEADERS BASE_DIRS ${CMAKE_CURRENT_SOURCE_DIR} FILES ${arg_HEADERS})
+    target_include_directories(${target} PUBLIC ${CMAKE_CURRENT_SOURCE_DIR})
+    target_link_libraries(${target} PUBLIC ${apis} $<LINK_ONLY:ka_module> PRIVATE ka_options ka_hardening)
+endfunction()
+
+# The layers of the module among some targets, as their headers alone.
+function(ka_apis result)
+    set(apis)
+    foreach(target IN LISTS ARGN)
+        if(TARGET ${target}_api)
+            list(APPEND apis ${target}_api)
+        else()
+            list(APPEND apis ${target})
+        endif()
+    endforeach()
+    set(${result} ${apis} PARENT_SCOPE)
+endfunction()
+
+# What needs the module needs it in one of two ways. A program links the shared libraries; a target with the property
+# KA_LINKS_LAYERS, as tests have, links the layers themselves. Both in one program would be two of every variable.
+add_library(ka_module INTERFACE)
+target_link_libraries(ka_module INTERFACE $<IF:$<BOOL:$<TARGET_PROPERTY:KA_LINKS_LAYERS>>,ka_ui,KaReport>)

@@ -9,9 +9,9 @@ mkdir -p out/api
     cat docs/Doxyfile
     # What is installed is what is public.
     printf 'INPUT ='
-    sed -n '/ HEADERS/,/PRIVATE_HEADERS\|SOURCES/p' {host/*,templates,output,report,view,ui}/CMakeLists.txt |
+    sed -n '/ HEADERS/,/PRIVATE_HEADERS\|SOURCES/p' {host/*,templates,page,formats/*,report,print,view,ui}/CMakeLists.txt |
         tr ' ' '\n' | grep '\.h$' | sort -u |
-        while read -r header; do find host templates page output report view ui -name "$header" -printf ' %p'; done
+        while read -r header; do find host templates page formats report print view ui -name "$header" -printf ' %p'; done
     echo
 } > out/api/Doxyfile
 doxygen -q out/api/Doxyfile

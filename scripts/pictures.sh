@@ -12,8 +12,8 @@ folder=${1:-out/pictures}
 scripts/packages.sh build test
 scripts/build.sh dev
 for scale in 1 2; do
-    QT_SCALE_FACTOR=$scale build/dev/pictures/ka_pictures --suffix "-light-${scale}x" "$folder"
-    QT_SCALE_FACTOR=$scale build/dev/pictures/ka_pictures --dark --suffix "-dark-${scale}x" "$folder"
+    QT_SCALE_FACTOR=$scale build/dev/tools/pictures/ka_pictures --suffix "-light-${scale}x" "$folder"
+    QT_SCALE_FACTOR=$scale build/dev/tools/pictures/ka_pictures --dark --suffix "-dark-${scale}x" "$folder"
 done
 if [ -n "$guides" ]; then
     mkdir -p docs/pictures

@@ -174,117 +174,117 @@
         <translation>%1 wird unverändert gedruckt</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
+        <location filename="../formats/pdf/PdfExport.cpp"/>
         <source>the page has not been measured</source>
         <translation>die Seite wurde noch nicht ausgemessen</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
+        <location filename="../formats/pdf/PdfExport.cpp"/>
         <source>a font size of 1 point or more was expected</source>
         <translation>eine Schriftgröße von mindestens 1 Punkt wurde erwartet</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
+        <location filename="../formats/pdf/PdfExport.cpp"/>
         <source>the margins leave no room on the page: smaller margins were expected</source>
         <translation>die Ränder lassen auf der Seite keinen Platz: kleinere Ränder wurden erwartet</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
+        <location filename="../formats/pdf/PdfExport.cpp"/>
         <source>the PDF library failed with error %1</source>
         <translation>die PDF-Bibliothek meldet den Fehler %1</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
+        <location filename="../formats/pdf/PdfExport.cpp"/>
         <source>the font file "%1" cannot be used</source>
         <translation>die Schriftdatei „%1“ kann nicht verwendet werden</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
+        <location filename="../formats/pdf/PdfExport.cpp"/>
         <source>no fixed-pitch font was found: DejaVu Sans Mono, Liberation Mono or Hack was expected</source>
         <translation>keine dicktengleiche Schrift wurde gefunden: DejaVu Sans Mono, Liberation Mono oder Hack wurde erwartet</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
+        <location filename="../formats/pdf/PdfExport.cpp"/>
         <source>stopped</source>
         <translation>abgebrochen</translation>
     </message>
     <message>
-        <location filename="../output/PdfNotes.cpp"/>
+        <location filename="../formats/pdf/PdfNotes.cpp"/>
         <source>line %1 is</source>
         <translation>Zeile %1 ist</translation>
     </message>
     <message>
-        <location filename="../output/PdfNotes.cpp"/>
+        <location filename="../formats/pdf/PdfNotes.cpp"/>
         <source>%1 lines, the first of them line %2, are</source>
         <translation>%1 Zeilen, zuerst Zeile %2, sind</translation>
     </message>
     <message>
-        <location filename="../output/PdfNotes.cpp"/>
+        <location filename="../formats/pdf/PdfNotes.cpp"/>
         <source>%1 wider than the page: the type is %2 points on all pages</source>
         <translation>%1 breiter als die Seite: die Schrift hat auf allen Seiten %2 Punkt</translation>
     </message>
     <message>
-        <location filename="../output/PdfNotes.cpp"/>
+        <location filename="../formats/pdf/PdfNotes.cpp"/>
         <source>%1 wider than the page in type of %2 points: what is too wide goes on below</source>
         <translation>%1 auch bei %2 Punkt breiter als die Seite: was zu breit ist, steht darunter</translation>
     </message>
     <message>
-        <location filename="../output/PdfNotes.cpp"/>
+        <location filename="../formats/pdf/PdfNotes.cpp"/>
         <source>no font has the character "%1" (U+%2), first in line %3, %4 times in all</source>
         <translation>keine Schrift enthält das Zeichen „%1“ (U+%2), zuerst in Zeile %3, insgesamt %4-mal</translation>
     </message>
     <message>
-        <location filename="../output/PdfNotes.cpp"/>
+        <location filename="../formats/pdf/PdfNotes.cpp"/>
         <source>no font has %1 other characters, %2 times in all</source>
         <translation>%1 weitere Zeichen sind in keiner Schrift enthalten, insgesamt %2-mal</translation>
     </message>
     <message>
-        <location filename="../output/RichTextParser.cpp"/>
+        <location filename="../formats/richtext/RichTextParser.cpp"/>
         <source>%1 bytes of data were expected behind \bin</source>
         <translation>%1 Byte Daten wurden hinter \bin erwartet</translation>
     </message>
     <message>
-        <location filename="../output/RichTextParser.cpp"/>
+        <location filename="../formats/richtext/RichTextParser.cpp"/>
         <source>a closing brace was expected: groups that are still open: %1</source>
         <translation>eine schließende geschweifte Klammer wurde erwartet: noch offene Gruppen: %1</translation>
     </message>
     <message>
-        <location filename="../output/RichTextParser.cpp"/>
+        <location filename="../formats/richtext/RichTextParser.cpp"/>
         <source>at most %1 groups inside each other were expected</source>
         <translation>höchstens %1 ineinander geschachtelte Gruppen wurden erwartet</translation>
     </message>
     <message>
-        <location filename="../output/RichTextReader.cpp"/>
+        <location filename="../formats/richtext/RichTextReader.cpp"/>
         <source>%1 was expected, with which a rich text begins</source>
         <translation>%1 wurde erwartet, womit Rich-Text beginnt</translation>
     </message>
     <message>
-        <location filename="../output/RichTextReader.cpp"/>
+        <location filename="../formats/richtext/RichTextReader.cpp"/>
         <source>Pictures are not shown: %1.</source>
         <translation>Bilder werden nicht angezeigt: %1.</translation>
     </message>
     <message>
-        <location filename="../output/RichTextReader.cpp"/>
+        <location filename="../formats/richtext/RichTextReader.cpp"/>
         <source>Embedded objects and drawings are not shown: %1.</source>
         <translation>Eingebettete Objekte und Zeichnungen werden nicht angezeigt: %1.</translation>
     </message>
     <message>
-        <location filename="../output/RichTextReader.cpp"/>
+        <location filename="../formats/richtext/RichTextReader.cpp"/>
         <source>Footnotes and comments are not shown: %1.</source>
         <translation>Fußnoten und Kommentare werden nicht angezeigt: %1.</translation>
     </message>
     <message>
-        <location filename="../output/RichTextReader.cpp"/>
+        <location filename="../formats/richtext/RichTextReader.cpp"/>
         <source>Page headers and footers are not shown: %1.</source>
         <translation>Kopf- und Fußzeilen werden nicht angezeigt: %1.</translation>
     </message>
     <message>
-        <location filename="../output/RichTextReader.cpp"/>
+        <location filename="../formats/richtext/RichTextReader.cpp"/>
         <source>Hidden text is not shown: %1.</source>
         <translation>Verborgener Text wird nicht angezeigt: %1.</translation>
     </message>
     <message>
-        <location filename="../output/RichTextReader.cpp"/>
+        <location filename="../formats/richtext/RichTextReader.cpp"/>
         <source>Characters of symbol fonts are not known: %1.</source>
         <translation>Zeichen aus Symbolschriften sind nicht bekannt: %1.</translation>
     </message>
@@ -323,6 +323,176 @@
         <location filename="../report/UReportDocFile.cpp"/>
         <source>a part of the report was lost when memory ran out</source>
         <translation>ein Teil des Berichts ging verloren, als der Speicher ausging</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupDialog.cpp"/>
+        <source>Page Setup</source>
+        <translation>Seite einrichten</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>As the report was &amp;made</source>
+        <translation>Wie im Bericht an&amp;gelegt</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>As the report was &amp;made (1 line)</source>
+        <translation>Wie im Bericht an&amp;gelegt (1 Zeile)</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>As the report was &amp;made (%1 lines)</source>
+        <translation>Wie im Bericht an&amp;gelegt (%1 Zeilen)</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>P&amp;ortrait</source>
+        <translation>&amp;Hochformat</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>L&amp;andscape</source>
+        <translation>&amp;Querformat</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>As the &amp;sheet takes them</source>
+        <translation>Wie sie auf das &amp;Blatt passen</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Pr&amp;inter:</source>
+        <translation>&amp;Drucker:</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Printer</source>
+        <translation>Drucker</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Pa&amp;per:</source>
+        <translation>Pa&amp;pier:</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Paper</source>
+        <translation>Papier</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Orientation</source>
+        <translation>Ausrichtung</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Margins</source>
+        <translation>Seitenränder</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>&amp;Left:</source>
+        <translation>&amp;Links:</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>&amp;Top:</source>
+        <translation>&amp;Oben:</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>&amp;Right:</source>
+        <translation>&amp;Rechts:</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>&amp;Bottom:</source>
+        <translation>&amp;Unten:</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Left margin</source>
+        <translation>Linker Rand</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Top margin</source>
+        <translation>Oberer Rand</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Right margin</source>
+        <translation>Rechter Rand</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Bottom margin</source>
+        <translation>Unterer Rand</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source> mm</source>
+        <translation> mm</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Pages</source>
+        <translation>Seiten</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Pages: %1</source>
+        <translation>Seiten: %1</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Each page of the report is printed on a sheet of its own, in smaller type where it has to be.</source>
+        <translation>Jede Seite des Berichts wird auf ein eigenes Blatt gedruckt, wo nötig in kleinerer Schrift.</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Each sheet takes as many lines as fit, and the next sheet goes on from there.</source>
+        <translation>Jedes Blatt nimmt so viele Zeilen auf, wie darauf passen, und das nächste fährt dort fort.</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Paper: %1 x %2 mm</source>
+        <translation>Papier: %1 x %2 mm</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>These margins leave no room for text on the paper. Choose smaller margins.</source>
+        <translation>Diese Ränder lassen auf dem Papier keinen Platz für Text. Bitte kleinere Ränder wählen.</translation>
+    </message>
+    <message>
+        <location filename="../print/PrintDialogs.cpp"/>
+        <source>Print</source>
+        <translation>Drucken</translation>
+    </message>
+    <message>
+        <location filename="../print/PrintDialogs.cpp"/>
+        <source>Print Preview</source>
+        <translation>Druckvorschau</translation>
+    </message>
+    <message>
+        <location filename="../print/PrintProgress.cpp"/>
+        <source>Printing</source>
+        <translation>Drucken</translation>
+    </message>
+    <message>
+        <location filename="../print/PrintProgress.cpp"/>
+        <source>Cancel</source>
+        <translation>Abbrechen</translation>
+    </message>
+    <message>
+        <location filename="../print/PrintProgress.cpp"/>
+        <source>Page %1 of %2</source>
+        <translation>Seite %1 von %2</translation>
+    </message>
+    <message>
+        <location filename="../print/PrintTarget.cpp"/>
+        <source>There is no room left for the pages.</source>
+        <translation>Für die Seiten ist kein Speicherplatz mehr frei.</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
@@ -393,11 +563,6 @@
     </message>
     <message>
         <location filename="../view/PageBar.cpp"/>
-        <source>Pages</source>
-        <translation>Seiten</translation>
-    </message>
-    <message>
-        <location filename="../view/PageBar.cpp"/>
         <source>&amp;Go to page</source>
         <translation>&amp;Gehe zu Seite</translation>
     </message>
@@ -411,171 +576,6 @@
         <source>of %1</source>
         <comment>number of pages</comment>
         <translation>von %1</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupDialog.cpp"/>
-        <source>Page Setup</source>
-        <translation>Seite einrichten</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>As the report was &amp;made</source>
-        <translation>Wie im Bericht an&amp;gelegt</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>As the report was &amp;made (1 line)</source>
-        <translation>Wie im Bericht an&amp;gelegt (1 Zeile)</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>As the report was &amp;made (%1 lines)</source>
-        <translation>Wie im Bericht an&amp;gelegt (%1 Zeilen)</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>P&amp;ortrait</source>
-        <translation>&amp;Hochformat</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>L&amp;andscape</source>
-        <translation>&amp;Querformat</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>As the &amp;sheet takes them</source>
-        <translation>Wie sie auf das &amp;Blatt passen</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Pr&amp;inter:</source>
-        <translation>&amp;Drucker:</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Printer</source>
-        <translation>Drucker</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Pa&amp;per:</source>
-        <translation>Pa&amp;pier:</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Paper</source>
-        <translation>Papier</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Orientation</source>
-        <translation>Ausrichtung</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Margins</source>
-        <translation>Seitenränder</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>&amp;Left:</source>
-        <translation>&amp;Links:</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>&amp;Top:</source>
-        <translation>&amp;Oben:</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>&amp;Right:</source>
-        <translation>&amp;Rechts:</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>&amp;Bottom:</source>
-        <translation>&amp;Unten:</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Left margin</source>
-        <translation>Linker Rand</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Top margin</source>
-        <translation>Oberer Rand</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Right margin</source>
-        <translation>Rechter Rand</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Bottom margin</source>
-        <translation>Unterer Rand</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source> mm</source>
-        <translation> mm</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Pages: %1</source>
-        <translation>Seiten: %1</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Each page of the report is printed on a sheet of its own, in smaller type where it has to be.</source>
-        <translation>Jede Seite des Berichts wird auf ein eigenes Blatt gedruckt, wo nötig in kleinerer Schrift.</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Each sheet takes as many lines as fit, and the next sheet goes on from there.</source>
-        <translation>Jedes Blatt nimmt so viele Zeilen auf, wie darauf passen, und das nächste fährt dort fort.</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Paper: %1 x %2 mm</source>
-        <translation>Papier: %1 x %2 mm</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>These margins leave no room for text on the paper. Choose smaller margins.</source>
-        <translation>Diese Ränder lassen auf dem Papier keinen Platz für Text. Bitte kleinere Ränder wählen.</translation>
-    </message>
-    <message>
-        <location filename="../view/PrintDialogs.cpp"/>
-        <source>Print</source>
-        <translation>Drucken</translation>
-    </message>
-    <message>
-        <location filename="../view/PrintDialogs.cpp"/>
-        <source>Print Preview</source>
-        <translation>Druckvorschau</translation>
-    </message>
-    <message>
-        <location filename="../view/PrintProgress.cpp"/>
-        <source>Printing</source>
-        <translation>Drucken</translation>
-    </message>
-    <message>
-        <location filename="../view/PrintProgress.cpp"/>
-        <source>Cancel</source>
-        <translation>Abbrechen</translation>
-    </message>
-    <message>
-        <location filename="../view/PrintProgress.cpp"/>
-        <source>Page %1 of %2</source>
-        <translation>Seite %1 von %2</translation>
-    </message>
-    <message>
-        <location filename="../view/PrintTarget.cpp"/>
-        <source>There is no room left for the pages.</source>
-        <translation>Für die Seiten ist kein Speicherplatz mehr frei.</translation>
     </message>
     <message>
         <location filename="../view/ReportEdit.cpp"/>
@@ -846,6 +846,451 @@
         <translation>in</translation>
     </message>
     <message>
+        <location filename="../sources/FileBytesPosix.cpp"/>
+        <source>the file was cut short while it was read</source>
+        <translation>die Datei wurde beim Lesen abgeschnitten</translation>
+    </message>
+    <message>
+        <location filename="../sources/FileBytesPosix.cpp"/>
+        <source>more than %1 MB come out of what is no file</source>
+        <translation>mehr als %1 MB kommen aus einer Quelle, die keine Datei ist</translation>
+    </message>
+    <message>
+        <location filename="../sources/RowBatches.cpp"/>
+        <source>there is not enough memory for the data</source>
+        <translation>der Arbeitsspeicher reicht für die Daten nicht aus</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
+        <source>a whole number</source>
+        <translation>eine ganze Zahl</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
+        <source>a text</source>
+        <translation>ein Text</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
+        <source>yes or no</source>
+        <translation>yes oder no</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
+        <source>a station such as 12+345.678</source>
+        <translation>eine Station wie 12+345.678</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
+        <source>an angle such as 45-30-15</source>
+        <translation>ein Winkel wie 45-30-15</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
+        <source>a number</source>
+        <translation>eine Zahl</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvObjectList.cpp"/>
+        <source>a header row of variable names was expected</source>
+        <translation>eine Kopfzeile mit Variablennamen wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvObjectList.cpp"/>
+        <source>the columns %1 and %2 are both named "%3": each variable was expected once</source>
+        <translation>die Spalten %1 und %2 heißen beide „%3“: jede Variable wurde nur einmal erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvObjectList.cpp"/>
+        <source>no column of the header row is a variable of the dictionary: a header row of variable names, with the data's delimiter between them, was expected</source>
+        <translation>keine Spalte der Kopfzeile ist eine Variable des Wörterbuchs: eine Kopfzeile mit Variablennamen, dazwischen das Trennzeichen der Daten, wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvObjectList.cpp"/>
+        <source>the row has %1 cells: %2 were expected, as in the header row</source>
+        <translation>die Zeile hat %1 Zellen: wie in der Kopfzeile wurden %2 erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvObjectList.cpp"/>
+        <source>the cell "%1" of the column "%2" does not fit: %3 was expected</source>
+        <translation>die Zelle „%1“ der Spalte „%2“ passt nicht: %3 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvReader.cpp"/>
+        <source>the file is not UTF-8</source>
+        <translation>die Datei ist nicht in UTF-8 kodiert</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvReader.cpp"/>
+        <source>a delimiter was expected behind the closing quote</source>
+        <translation>hinter dem schließenden Anführungszeichen wurde ein Trennzeichen erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvReader.cpp"/>
+        <source>a quote inside a cell was not expected: the whole cell must stand in quotes and the quote be doubled</source>
+        <translation>ein Anführungszeichen in einer Zelle wurde nicht erwartet: die ganze Zelle muss in Anführungszeichen stehen und das Zeichen selbst doppelt</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvReader.cpp"/>
+        <source>a zero byte stands in the file: a text file was expected</source>
+        <translation>die Datei enthält ein Nullbyte: eine Textdatei wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvReader.cpp"/>
+        <source>the quoted cell has no closing quote</source>
+        <translation>der Zelle in Anführungszeichen fehlt das schließende Anführungszeichen</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvReader.cpp"/>
+        <source>a carriage return without a line feed was not expected</source>
+        <translation>ein Wagenrücklauf (CR) ohne Zeilenvorschub (LF) wurde nicht erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvReader.cpp"/>
+        <source>the row is longer than %1 bytes: a table of rows was expected</source>
+        <translation>die Zeile ist länger als %1 Byte: eine Tabelle aus Zeilen wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobList.cpp"/>
+        <source>standard input cannot be read: %1</source>
+        <translation>die Standardeingabe kann nicht gelesen werden: %1</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobList.cpp"/>
+        <source>the list of jobs cannot be read: %1</source>
+        <translation>die Liste der Aufträge kann nicht gelesen werden: %1</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobList.cpp"/>
+        <source>the list of jobs has lines and characters 0 as well: names on lines, or each ended by a character 0, were expected</source>
+        <translation>die Liste der Aufträge hat Zeilen und auch Zeichen 0: Namen auf Zeilen, oder jeder mit einem Zeichen 0 beendet, wurden erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>one of %1 was expected</source>
+        <translation>einer dieser Werte wurde erwartet: %1</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>a list of four margins (left, top, right, bottom) was expected</source>
+        <translation>eine Liste von vier Seitenrändern (links, oben, rechts, unten) wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>a character code or a text of one character was expected</source>
+        <translation>ein Zeichencode oder ein Text aus einem Zeichen wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>a file name without a character 0 was expected</source>
+        <translation>ein Dateiname ohne das Zeichen 0 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>either "csv" or "values" was expected</source>
+        <translation>entweder "csv" oder "values" wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>an object or a list of objects was expected</source>
+        <translation>ein Objekt oder eine Liste von Objekten wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>a text of one ASCII character that is neither a quote nor a line end was expected</source>
+        <translation>ein Text aus einem ASCII-Zeichen, das weder Anführungszeichen noch Zeilenende ist, wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>true was expected</source>
+        <translation>true wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>a step was expected: one of heading, line, lineFeed, newPage, block, table, clear</source>
+        <translation>ein Schritt wurde erwartet: einer von heading, line, lineFeed, newPage, block, table, clear</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>a "%1" needs a template: the key "template" was expected in the job</source>
+        <translation>"%1" benötigt eine Vorlage: im Auftrag wurde der Schlüssel "template" erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>the key "data" with the name of a data set was expected</source>
+        <translation>der Schlüssel "data" mit dem Namen eines Datenbestands wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>there is no data set named "%1" in the job</source>
+        <translation>im Auftrag gibt es keinen Datenbestand namens „%1“</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>the key "report" with a list of steps was expected</source>
+        <translation>der Schlüssel "report" mit einer Liste von Schritten wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>the key "file" was expected</source>
+        <translation>der Schlüssel "file" wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>the ending of "%1" says no kind: the key "as" with one of %2 was expected</source>
+        <translation>die Endung von „%1“ nennt keine Art: der Schlüssel "as" mit einem dieser Werte wurde erwartet: %2</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>a text that begins with "%1" was expected</source>
+        <translation>ein Text, der mit „%1“ beginnt, wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>a date and time such as 2024-03-05T14:07:00 was expected</source>
+        <translation>Datum und Uhrzeit in der Form 2024-03-05T14:07:00 wurden erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>the key "%1" with a text was expected</source>
+        <translation>der Schlüssel "%1" mit einem Text wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>block</source>
+        <translation>Block</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>table</source>
+        <translation>Tabelle</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>the template has no %1 named "%2": one of %3 was expected</source>
+        <translation>%1 „%2“ fehlt in der Vorlage; vorhanden: %3</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>none</source>
+        <translation>keine</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>the %1 "%2" cannot be written: the template has no dictionary named "%3"</source>
+        <translation>%1 „%2“ kann nicht geschrieben werden: die Vorlage hat kein Wörterbuch namens „%3“</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>the %1 "%2" cannot be written: the format of its field "%3" is beyond %4 characters</source>
+        <translation>%1 „%2“ kann nicht geschrieben werden: das Format des Felds „%3“ geht über %4 Zeichen hinaus</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>the data file "%1" cannot be read: %2</source>
+        <translation>die Datendatei „%1“ kann nicht gelesen werden: %2</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>Reading %1</source>
+        <translation>%1 wird gelesen</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>the data "%1" has no row: a block shows the first one</source>
+        <translation>der Datenbestand „%1“ hat keine Zeile: ein Block zeigt die erste</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>a row was expected behind the header row: a block shows the first one</source>
+        <translation>hinter der Kopfzeile wurde eine Zeile erwartet: ein Block zeigt die erste</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>the report could not be made</source>
+        <translation>der Bericht konnte nicht erstellt werden</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>the margins leave no room on the page: smaller margins or a smaller font were expected</source>
+        <translation>die Ränder lassen auf der Seite keinen Platz: kleinere Ränder oder eine kleinere Schrift wurden erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>there is no template file "%1"</source>
+        <translation>es gibt keine Vorlagendatei „%1“</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobSettingsReader.cpp"/>
+        <source>a list of three texts was expected</source>
+        <translation>eine Liste von drei Texten wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobSettingsReader.cpp"/>
+        <source>one character with a code up to 255, or an empty text, was expected</source>
+        <translation>ein Zeichen mit einem Code bis 255 oder ein leerer Text wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>the key "%1" stands twice in "%2"</source>
+        <translation>der Schlüssel „%1“ kommt in „%2“ zweimal vor</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>the file cannot be read: %1</source>
+        <translation>die Datei kann nicht gelesen werden: %1</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>the file is larger than %1 MB: a job was expected</source>
+        <translation>die Datei ist größer als %1 MB: ein Auftrag wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>a JSON object was expected: %1</source>
+        <translation>ein JSON-Objekt wurde erwartet: %1</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>a JSON object was expected</source>
+        <translation>ein JSON-Objekt wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>the key "%1" stands in line %2 already: each key was expected once</source>
+        <translation>der Schlüssel „%1“ steht schon in Zeile %2: jeder Schlüssel wurde nur einmal erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>the key "%1" has %2 steps: at most %3 were expected</source>
+        <translation>der Schlüssel „%1“ hat %2 Stufen: höchstens %3 wurden erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>there is no place for the key "%1" in the job</source>
+        <translation>für den Schlüssel "%1" ist im Auftrag kein Platz</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>a text was expected</source>
+        <translation>ein Text wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>true or false was expected</source>
+        <translation>true oder false wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>a whole number from %1 to %2 was expected</source>
+        <translation>eine ganze Zahl von %1 bis %2 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>an object was expected</source>
+        <translation>ein Objekt wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>a list was expected</source>
+        <translation>eine Liste wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>unknown key "%1": %2 expected</source>
+        <translation>unbekannter Schlüssel "%1": erwartet: %2</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonObjectList.cpp"/>
+        <source>the variable "%1" stands twice: each variable was expected once</source>
+        <translation>die Variable „%1“ kommt zweimal vor: jede Variable wurde nur einmal erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonObjectList.cpp"/>
+        <source>the value of "%1" does not fit: %2 was expected</source>
+        <translation>der Wert von „%1“ passt nicht: %2 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/OutputClash.cpp"/>
+        <source>"%1" is data of the job: an output of its own was expected</source>
+        <translation>„%1“ enthält Daten des Auftrags: eine eigene Ausgabe wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/OutputClash.cpp"/>
+        <source>"%1" is the template of the job: an output of its own was expected</source>
+        <translation>„%1“ ist die Vorlage des Auftrags: eine eigene Ausgabe wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/OutputClash.cpp"/>
+        <source>"%1" is the job itself: an output of its own was expected</source>
+        <translation>„%1“ ist der Auftrag selbst: eine eigene Ausgabe wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/OutputClash.cpp"/>
+        <source>"%1" is the file of the output "%2" already: an output of its own was expected</source>
+        <translation>„%1“ ist schon die Datei der Ausgabe „%2“: eine eigene Ausgabe wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/OutputWriter.cpp"/>
+        <source>"%1" was not written: it would have more than %2</source>
+        <translation>„%1“ wurde nicht geschrieben: die Datei hätte mehr als %2</translation>
+    </message>
+    <message>
+        <location filename="../jobs/OutputWriter.cpp"/>
+        <source>the report could not be written to standard output: %1</source>
+        <translation>der Bericht konnte nicht in die Standardausgabe geschrieben werden: %1</translation>
+    </message>
+    <message>
+        <location filename="../jobs/OutputWriter.cpp"/>
+        <source>the report begins as rich text, but %1 (line %2, column %3)</source>
+        <translation>der Bericht beginnt als Rich-Text, aber %1 (Zeile %2, Spalte %3)</translation>
+    </message>
+    <message>
+        <location filename="../jobs/OutputWriter.cpp"/>
+        <source>"%1" could not be written: %2</source>
+        <translation>„%1“ konnte nicht geschrieben werden: %2</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TemplateSource.cpp"/>
+        <source>the template file cannot be read: there is no such file</source>
+        <translation>die Vorlagendatei kann nicht gelesen werden: es gibt sie nicht</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TemplateSource.cpp"/>
+        <source>a template file was expected; this is a folder, a pipe or a device</source>
+        <translation>eine Vorlagendatei wurde erwartet; dies ist ein Ordner, eine Pipe oder ein Gerät</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TemplateSource.cpp"/>
+        <source>the template file has %1 MB: at most %2 MB were expected</source>
+        <translation>die Vorlagendatei hat %1 MB: höchstens %2 MB wurden erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TemplateSource.cpp"/>
+        <source>the template file cannot be read</source>
+        <translation>die Vorlagendatei kann nicht gelesen werden</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TemplateSource.cpp"/>
+        <source>the template file is empty: a &lt;ReportTemplate&gt; element was expected</source>
+        <translation>die Vorlagendatei ist leer: ein Element &lt;ReportTemplate&gt; wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TemplateSource.cpp"/>
+        <source>the template "%1" cannot be loaded: %2</source>
+        <translation>die Vorlage „%1“ kann nicht geladen werden: %2</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TemplateSource.cpp"/>
+        <source>the file holds no template: a &lt;ReportTemplate&gt; element was expected</source>
+        <translation>die Datei enthält keine Vorlage: ein Element &lt;ReportTemplate&gt; wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TemplateSource.cpp"/>
+        <source>there is no template named "%1": one of %2 was expected</source>
+        <translation>es gibt keine Vorlage namens „%1“; vorhanden: %2</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/CommandSetup.cpp"/>
         <source>--as: one of %1 was expected</source>
         <translation>--as: einer dieser Werte wurde erwartet: %1</translation>
@@ -889,376 +1334,6 @@
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>kareport: warning: "%1": %2</source>
         <translation>kareport: Warnung: „%1“: %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvObjectList.cpp"/>
-        <source>a header row of variable names was expected</source>
-        <translation>eine Kopfzeile mit Variablennamen wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvObjectList.cpp"/>
-        <source>the columns %1 and %2 are both named "%3": each variable was expected once</source>
-        <translation>die Spalten %1 und %2 heißen beide „%3“: jede Variable wurde nur einmal erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvObjectList.cpp"/>
-        <source>no column of the header row is a variable of the dictionary: a header row of variable names, with the data's delimiter between them, was expected</source>
-        <translation>keine Spalte der Kopfzeile ist eine Variable des Wörterbuchs: eine Kopfzeile mit Variablennamen, dazwischen das Trennzeichen der Daten, wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvObjectList.cpp"/>
-        <source>the row has %1 cells: %2 were expected, as in the header row</source>
-        <translation>die Zeile hat %1 Zellen: wie in der Kopfzeile wurden %2 erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvObjectList.cpp"/>
-        <source>the cell "%1" of the column "%2" does not fit: %3 was expected</source>
-        <translation>die Zelle „%1“ der Spalte „%2“ passt nicht: %3 wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvReader.cpp"/>
-        <source>the file is not UTF-8</source>
-        <translation>die Datei ist nicht in UTF-8 kodiert</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvReader.cpp"/>
-        <source>a delimiter was expected behind the closing quote</source>
-        <translation>hinter dem schließenden Anführungszeichen wurde ein Trennzeichen erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvReader.cpp"/>
-        <source>a quote inside a cell was not expected: the whole cell must stand in quotes and the quote be doubled</source>
-        <translation>ein Anführungszeichen in einer Zelle wurde nicht erwartet: die ganze Zelle muss in Anführungszeichen stehen und das Zeichen selbst doppelt</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvReader.cpp"/>
-        <source>a zero byte stands in the file: a text file was expected</source>
-        <translation>die Datei enthält ein Nullbyte: eine Textdatei wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvReader.cpp"/>
-        <source>the quoted cell has no closing quote</source>
-        <translation>der Zelle in Anführungszeichen fehlt das schließende Anführungszeichen</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvReader.cpp"/>
-        <source>a carriage return without a line feed was not expected</source>
-        <translation>ein Wagenrücklauf (CR) ohne Zeilenvorschub (LF) wurde nicht erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvReader.cpp"/>
-        <source>the row is longer than %1 bytes: a table of rows was expected</source>
-        <translation>die Zeile ist länger als %1 Byte: eine Tabelle aus Zeilen wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/FileBytesPosix.cpp"/>
-        <source>the file was cut short while it was read</source>
-        <translation>die Datei wurde beim Lesen abgeschnitten</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/FileBytesPosix.cpp"/>
-        <source>more than %1 MB come out of what is no file</source>
-        <translation>mehr als %1 MB kommen aus einer Quelle, die keine Datei ist</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobList.cpp"/>
-        <source>standard input cannot be read: %1</source>
-        <translation>die Standardeingabe kann nicht gelesen werden: %1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobList.cpp"/>
-        <source>the list of jobs cannot be read: %1</source>
-        <translation>die Liste der Aufträge kann nicht gelesen werden: %1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobList.cpp"/>
-        <source>the list of jobs has lines and characters 0 as well: names on lines, or each ended by a character 0, were expected</source>
-        <translation>die Liste der Aufträge hat Zeilen und auch Zeichen 0: Namen auf Zeilen, oder jeder mit einem Zeichen 0 beendet, wurden erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>one of %1 was expected</source>
-        <translation>einer dieser Werte wurde erwartet: %1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>a list of four margins (left, top, right, bottom) was expected</source>
-        <translation>eine Liste von vier Seitenrändern (links, oben, rechts, unten) wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>a character code or a text of one character was expected</source>
-        <translation>ein Zeichencode oder ein Text aus einem Zeichen wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>a file name without a character 0 was expected</source>
-        <translation>ein Dateiname ohne das Zeichen 0 wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>either "csv" or "values" was expected</source>
-        <translation>entweder "csv" oder "values" wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>an object or a list of objects was expected</source>
-        <translation>ein Objekt oder eine Liste von Objekten wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>a text of one ASCII character that is neither a quote nor a line end was expected</source>
-        <translation>ein Text aus einem ASCII-Zeichen, das weder Anführungszeichen noch Zeilenende ist, wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>true was expected</source>
-        <translation>true wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>a step was expected: one of heading, line, lineFeed, newPage, block, table, clear</source>
-        <translation>ein Schritt wurde erwartet: einer von heading, line, lineFeed, newPage, block, table, clear</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>a "%1" needs a template: the key "template" was expected in the job</source>
-        <translation>"%1" benötigt eine Vorlage: im Auftrag wurde der Schlüssel "template" erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>the key "data" with the name of a data set was expected</source>
-        <translation>der Schlüssel "data" mit dem Namen eines Datenbestands wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>there is no data set named "%1" in the job</source>
-        <translation>im Auftrag gibt es keinen Datenbestand namens „%1“</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>the key "report" with a list of steps was expected</source>
-        <translation>der Schlüssel "report" mit einer Liste von Schritten wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>the key "file" was expected</source>
-        <translation>der Schlüssel "file" wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>the ending of "%1" says no kind: the key "as" with one of %2 was expected</source>
-        <translation>die Endung von „%1“ nennt keine Art: der Schlüssel "as" mit einem dieser Werte wurde erwartet: %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>a text that begins with "%1" was expected</source>
-        <translation>ein Text, der mit „%1“ beginnt, wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>a date and time such as 2024-03-05T14:07:00 was expected</source>
-        <translation>Datum und Uhrzeit in der Form 2024-03-05T14:07:00 wurden erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>the key "%1" with a text was expected</source>
-        <translation>der Schlüssel "%1" mit einem Text wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>block</source>
-        <translation>Block</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>table</source>
-        <translation>Tabelle</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>the template has no %1 named "%2": one of %3 was expected</source>
-        <translation>%1 „%2“ fehlt in der Vorlage; vorhanden: %3</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>none</source>
-        <translation>keine</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>the %1 "%2" cannot be written: the template has no dictionary named "%3"</source>
-        <translation>%1 „%2“ kann nicht geschrieben werden: die Vorlage hat kein Wörterbuch namens „%3“</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>the %1 "%2" cannot be written: the format of its field "%3" is beyond %4 characters</source>
-        <translation>%1 „%2“ kann nicht geschrieben werden: das Format des Felds „%3“ geht über %4 Zeichen hinaus</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>the data file "%1" cannot be read: %2</source>
-        <translation>die Datendatei „%1“ kann nicht gelesen werden: %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>Reading %1</source>
-        <translation>%1 wird gelesen</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>the data "%1" has no row: a block shows the first one</source>
-        <translation>der Datenbestand „%1“ hat keine Zeile: ein Block zeigt die erste</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>a row was expected behind the header row: a block shows the first one</source>
-        <translation>hinter der Kopfzeile wurde eine Zeile erwartet: ein Block zeigt die erste</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>the report could not be made</source>
-        <translation>der Bericht konnte nicht erstellt werden</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>the margins leave no room on the page: smaller margins or a smaller font were expected</source>
-        <translation>die Ränder lassen auf der Seite keinen Platz: kleinere Ränder oder eine kleinere Schrift wurden erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>there is no template file "%1"</source>
-        <translation>es gibt keine Vorlagendatei „%1“</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobSettingsReader.cpp"/>
-        <source>a list of three texts was expected</source>
-        <translation>eine Liste von drei Texten wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobSettingsReader.cpp"/>
-        <source>one character with a code up to 255, or an empty text, was expected</source>
-        <translation>ein Zeichen mit einem Code bis 255 oder ein leerer Text wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>the key "%1" stands twice in "%2"</source>
-        <translation>der Schlüssel „%1“ kommt in „%2“ zweimal vor</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>the file cannot be read: %1</source>
-        <translation>die Datei kann nicht gelesen werden: %1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>the file is larger than %1 MB: a job was expected</source>
-        <translation>die Datei ist größer als %1 MB: ein Auftrag wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>a JSON object was expected: %1</source>
-        <translation>ein JSON-Objekt wurde erwartet: %1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>a JSON object was expected</source>
-        <translation>ein JSON-Objekt wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>the key "%1" stands in line %2 already: each key was expected once</source>
-        <translation>der Schlüssel „%1“ steht schon in Zeile %2: jeder Schlüssel wurde nur einmal erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>the key "%1" has %2 steps: at most %3 were expected</source>
-        <translation>der Schlüssel „%1“ hat %2 Stufen: höchstens %3 wurden erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>there is no place for the key "%1" in the job</source>
-        <translation>für den Schlüssel "%1" ist im Auftrag kein Platz</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>a text was expected</source>
-        <translation>ein Text wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>true or false was expected</source>
-        <translation>true oder false wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>a whole number from %1 to %2 was expected</source>
-        <translation>eine ganze Zahl von %1 bis %2 wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>an object was expected</source>
-        <translation>ein Objekt wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>a list was expected</source>
-        <translation>eine Liste wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>unknown key "%1": %2 expected</source>
-        <translation>unbekannter Schlüssel "%1": erwartet: %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonObjectList.cpp"/>
-        <source>the variable "%1" stands twice: each variable was expected once</source>
-        <translation>die Variable „%1“ kommt zweimal vor: jede Variable wurde nur einmal erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonObjectList.cpp"/>
-        <source>the value of "%1" does not fit: %2 was expected</source>
-        <translation>der Wert von „%1“ passt nicht: %2 wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputClash.cpp"/>
-        <source>"%1" is data of the job: an output of its own was expected</source>
-        <translation>„%1“ enthält Daten des Auftrags: eine eigene Ausgabe wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputClash.cpp"/>
-        <source>"%1" is the template of the job: an output of its own was expected</source>
-        <translation>„%1“ ist die Vorlage des Auftrags: eine eigene Ausgabe wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputClash.cpp"/>
-        <source>"%1" is the job itself: an output of its own was expected</source>
-        <translation>„%1“ ist der Auftrag selbst: eine eigene Ausgabe wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputClash.cpp"/>
-        <source>"%1" is the file of the output "%2" already: an output of its own was expected</source>
-        <translation>„%1“ ist schon die Datei der Ausgabe „%2“: eine eigene Ausgabe wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputWriter.cpp"/>
-        <source>"%1" was not written: it would have more than %2</source>
-        <translation>„%1“ wurde nicht geschrieben: die Datei hätte mehr als %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputWriter.cpp"/>
-        <source>the report could not be written to standard output: %1</source>
-        <translation>der Bericht konnte nicht in die Standardausgabe geschrieben werden: %1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputWriter.cpp"/>
-        <source>the report begins as rich text, but %1 (line %2, column %3)</source>
-        <translation>der Bericht beginnt als Rich-Text, aber %1 (Zeile %2, Spalte %3)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputWriter.cpp"/>
-        <source>"%1" could not be written: %2</source>
-        <translation>„%1“ konnte nicht geschrieben werden: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputsWriter.cpp"/>
@@ -1369,81 +1444,6 @@
         <location filename="../apps/kareport/RenderJob.cpp"/>
         <source>kareport: stopped; nothing was written</source>
         <translation>kareport: abgebrochen; es wurde nichts geschrieben</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/RowBatches.cpp"/>
-        <source>there is not enough memory for the data</source>
-        <translation>der Arbeitsspeicher reicht für die Daten nicht aus</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/TemplateSource.cpp"/>
-        <source>the template file cannot be read: there is no such file</source>
-        <translation>die Vorlagendatei kann nicht gelesen werden: es gibt sie nicht</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/TemplateSource.cpp"/>
-        <source>a template file was expected; this is a folder, a pipe or a device</source>
-        <translation>eine Vorlagendatei wurde erwartet; dies ist ein Ordner, eine Pipe oder ein Gerät</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/TemplateSource.cpp"/>
-        <source>the template file has %1 MB: at most %2 MB were expected</source>
-        <translation>die Vorlagendatei hat %1 MB: höchstens %2 MB wurden erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/TemplateSource.cpp"/>
-        <source>the template file cannot be read</source>
-        <translation>die Vorlagendatei kann nicht gelesen werden</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/TemplateSource.cpp"/>
-        <source>the template file is empty: a &lt;ReportTemplate&gt; element was expected</source>
-        <translation>die Vorlagendatei ist leer: ein Element &lt;ReportTemplate&gt; wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/TemplateSource.cpp"/>
-        <source>the template "%1" cannot be loaded: %2</source>
-        <translation>die Vorlage „%1“ kann nicht geladen werden: %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/TemplateSource.cpp"/>
-        <source>the file holds no template: a &lt;ReportTemplate&gt; element was expected</source>
-        <translation>die Datei enthält keine Vorlage: ein Element &lt;ReportTemplate&gt; wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/TemplateSource.cpp"/>
-        <source>there is no template named "%1": one of %2 was expected</source>
-        <translation>es gibt keine Vorlage namens „%1“; vorhanden: %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/ValueParser.cpp"/>
-        <source>a whole number</source>
-        <translation>eine ganze Zahl</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/ValueParser.cpp"/>
-        <source>a text</source>
-        <translation>ein Text</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/ValueParser.cpp"/>
-        <source>yes or no</source>
-        <translation>yes oder no</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/ValueParser.cpp"/>
-        <source>a station such as 12+345.678</source>
-        <translation>eine Station wie 12+345.678</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/ValueParser.cpp"/>
-        <source>an angle such as 45-30-15</source>
-        <translation>ein Winkel wie 45-30-15</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/ValueParser.cpp"/>
-        <source>a number</source>
-        <translation>eine Zahl</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ViewCommand.cpp"/>

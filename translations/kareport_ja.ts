@@ -174,117 +174,117 @@
         <translation>%1 はそのまま印字されます</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
+        <location filename="../formats/pdf/PdfExport.cpp"/>
         <source>the page has not been measured</source>
         <translation>ページの寸法がまだ求められていません</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
+        <location filename="../formats/pdf/PdfExport.cpp"/>
         <source>a font size of 1 point or more was expected</source>
         <translation>フォントサイズは 1 ポイント以上が必要です</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
+        <location filename="../formats/pdf/PdfExport.cpp"/>
         <source>the margins leave no room on the page: smaller margins were expected</source>
         <translation>余白が大きく、ページに印字できる範囲がありません: 余白を小さくする必要があります</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
+        <location filename="../formats/pdf/PdfExport.cpp"/>
         <source>the PDF library failed with error %1</source>
         <translation>PDF ライブラリでエラー %1 が発生しました</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
+        <location filename="../formats/pdf/PdfExport.cpp"/>
         <source>the font file "%1" cannot be used</source>
         <translation>フォントファイル「%1」は使用できません</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
+        <location filename="../formats/pdf/PdfExport.cpp"/>
         <source>no fixed-pitch font was found: DejaVu Sans Mono, Liberation Mono or Hack was expected</source>
         <translation>等幅フォントが見つかりません: DejaVu Sans Mono、Liberation Mono、Hack のいずれかが必要です</translation>
     </message>
     <message>
-        <location filename="../output/PdfExport.cpp"/>
+        <location filename="../formats/pdf/PdfExport.cpp"/>
         <source>stopped</source>
         <translation>中断されました</translation>
     </message>
     <message>
-        <location filename="../output/PdfNotes.cpp"/>
+        <location filename="../formats/pdf/PdfNotes.cpp"/>
         <source>line %1 is</source>
         <translation>%1 行目が</translation>
     </message>
     <message>
-        <location filename="../output/PdfNotes.cpp"/>
+        <location filename="../formats/pdf/PdfNotes.cpp"/>
         <source>%1 lines, the first of them line %2, are</source>
         <translation>%1 行 (最初は %2 行目) が</translation>
     </message>
     <message>
-        <location filename="../output/PdfNotes.cpp"/>
+        <location filename="../formats/pdf/PdfNotes.cpp"/>
         <source>%1 wider than the page: the type is %2 points on all pages</source>
         <translation>%1ページより幅が広いため、すべてのページの文字は %2 ポイントです</translation>
     </message>
     <message>
-        <location filename="../output/PdfNotes.cpp"/>
+        <location filename="../formats/pdf/PdfNotes.cpp"/>
         <source>%1 wider than the page in type of %2 points: what is too wide goes on below</source>
         <translation>%1 %2 ポイントの文字でもページより幅が広いため、はみ出す部分は下の行に続きます</translation>
     </message>
     <message>
-        <location filename="../output/PdfNotes.cpp"/>
+        <location filename="../formats/pdf/PdfNotes.cpp"/>
         <source>no font has the character "%1" (U+%2), first in line %3, %4 times in all</source>
         <translation>文字「%1」(U+%2) を含むフォントがありません (最初は %3 行目、全 %4 回)</translation>
     </message>
     <message>
-        <location filename="../output/PdfNotes.cpp"/>
+        <location filename="../formats/pdf/PdfNotes.cpp"/>
         <source>no font has %1 other characters, %2 times in all</source>
         <translation>ほかに %1 種類の文字を含むフォントがありません (全 %2 回)</translation>
     </message>
     <message>
-        <location filename="../output/RichTextParser.cpp"/>
+        <location filename="../formats/richtext/RichTextParser.cpp"/>
         <source>%1 bytes of data were expected behind \bin</source>
         <translation>\bin の後に %1 バイトのデータが必要です</translation>
     </message>
     <message>
-        <location filename="../output/RichTextParser.cpp"/>
+        <location filename="../formats/richtext/RichTextParser.cpp"/>
         <source>a closing brace was expected: groups that are still open: %1</source>
         <translation>閉じ波かっこが必要です: 閉じていないグループの数: %1</translation>
     </message>
     <message>
-        <location filename="../output/RichTextParser.cpp"/>
+        <location filename="../formats/richtext/RichTextParser.cpp"/>
         <source>at most %1 groups inside each other were expected</source>
         <translation>グループの入れ子は %1 段以下である必要があります</translation>
     </message>
     <message>
-        <location filename="../output/RichTextReader.cpp"/>
+        <location filename="../formats/richtext/RichTextReader.cpp"/>
         <source>%1 was expected, with which a rich text begins</source>
         <translation>リッチテキストの先頭には %1 が必要です</translation>
     </message>
     <message>
-        <location filename="../output/RichTextReader.cpp"/>
+        <location filename="../formats/richtext/RichTextReader.cpp"/>
         <source>Pictures are not shown: %1.</source>
         <translation>画像は表示されません: %1 個。</translation>
     </message>
     <message>
-        <location filename="../output/RichTextReader.cpp"/>
+        <location filename="../formats/richtext/RichTextReader.cpp"/>
         <source>Embedded objects and drawings are not shown: %1.</source>
         <translation>埋め込みオブジェクトと図形は表示されません: %1 個。</translation>
     </message>
     <message>
-        <location filename="../output/RichTextReader.cpp"/>
+        <location filename="../formats/richtext/RichTextReader.cpp"/>
         <source>Footnotes and comments are not shown: %1.</source>
         <translation>脚注とコメントは表示されません: %1 個。</translation>
     </message>
     <message>
-        <location filename="../output/RichTextReader.cpp"/>
+        <location filename="../formats/richtext/RichTextReader.cpp"/>
         <source>Page headers and footers are not shown: %1.</source>
         <translation>ヘッダーとフッターは表示されません: %1 個。</translation>
     </message>
     <message>
-        <location filename="../output/RichTextReader.cpp"/>
+        <location filename="../formats/richtext/RichTextReader.cpp"/>
         <source>Hidden text is not shown: %1.</source>
         <translation>隠し文字は表示されません: %1 個。</translation>
     </message>
     <message>
-        <location filename="../output/RichTextReader.cpp"/>
+        <location filename="../formats/richtext/RichTextReader.cpp"/>
         <source>Characters of symbol fonts are not known: %1.</source>
         <translation>記号フォントの不明な文字: %1 個。</translation>
     </message>
@@ -323,6 +323,176 @@
         <location filename="../report/UReportDocFile.cpp"/>
         <source>a part of the report was lost when memory ran out</source>
         <translation>メモリ不足でレポートの一部が失われました</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupDialog.cpp"/>
+        <source>Page Setup</source>
+        <translation>ページ設定</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>As the report was &amp;made</source>
+        <translation>作成時のページのまま(&amp;M)</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>As the report was &amp;made (1 line)</source>
+        <translation>作成時のページのまま (1 行)(&amp;M)</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>As the report was &amp;made (%1 lines)</source>
+        <translation>作成時のページのまま (%1 行)(&amp;M)</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>P&amp;ortrait</source>
+        <translation>縦(&amp;O)</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>L&amp;andscape</source>
+        <translation>横(&amp;A)</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>As the &amp;sheet takes them</source>
+        <translation>用紙に入る行数で区切る(&amp;S)</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Pr&amp;inter:</source>
+        <translation>プリンター(&amp;P):</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Printer</source>
+        <translation>プリンター</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Pa&amp;per:</source>
+        <translation>用紙(&amp;Z):</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Paper</source>
+        <translation>用紙</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Orientation</source>
+        <translation>印刷の向き</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Margins</source>
+        <translation>余白</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>&amp;Left:</source>
+        <translation>左(&amp;L):</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>&amp;Top:</source>
+        <translation>上(&amp;T):</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>&amp;Right:</source>
+        <translation>右(&amp;R):</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>&amp;Bottom:</source>
+        <translation>下(&amp;B):</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Left margin</source>
+        <translation>左余白</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Top margin</source>
+        <translation>上余白</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Right margin</source>
+        <translation>右余白</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Bottom margin</source>
+        <translation>下余白</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source> mm</source>
+        <translation> mm</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Pages</source>
+        <translation>ページ数</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Pages: %1</source>
+        <translation>ページ: %1</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Each page of the report is printed on a sheet of its own, in smaller type where it has to be.</source>
+        <translation>レポートの各ページを 1 枚ずつの用紙に印刷します。入りきらない場合は文字を小さくします。</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Each sheet takes as many lines as fit, and the next sheet goes on from there.</source>
+        <translation>各用紙に入るだけの行を印刷し、続きを次の用紙に印刷します。</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>Paper: %1 x %2 mm</source>
+        <translation>用紙: %1 x %2 mm</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
+        <source>These margins leave no room for text on the paper. Choose smaller margins.</source>
+        <translation>余白が大きく、用紙に印字できる範囲がありません。余白を小さくしてください。</translation>
+    </message>
+    <message>
+        <location filename="../print/PrintDialogs.cpp"/>
+        <source>Print</source>
+        <translation>印刷</translation>
+    </message>
+    <message>
+        <location filename="../print/PrintDialogs.cpp"/>
+        <source>Print Preview</source>
+        <translation>印刷プレビュー</translation>
+    </message>
+    <message>
+        <location filename="../print/PrintProgress.cpp"/>
+        <source>Printing</source>
+        <translation>印刷中</translation>
+    </message>
+    <message>
+        <location filename="../print/PrintProgress.cpp"/>
+        <source>Cancel</source>
+        <translation>キャンセル</translation>
+    </message>
+    <message>
+        <location filename="../print/PrintProgress.cpp"/>
+        <source>Page %1 of %2</source>
+        <translation>ページ %1 / %2</translation>
+    </message>
+    <message>
+        <location filename="../print/PrintTarget.cpp"/>
+        <source>There is no room left for the pages.</source>
+        <translation>ページを保存する空き容量がありません。</translation>
     </message>
     <message>
         <location filename="../view/FindBar.cpp"/>
@@ -393,11 +563,6 @@
     </message>
     <message>
         <location filename="../view/PageBar.cpp"/>
-        <source>Pages</source>
-        <translation>ページ数</translation>
-    </message>
-    <message>
-        <location filename="../view/PageBar.cpp"/>
         <source>&amp;Go to page</source>
         <translation>ページへ移動(&amp;G)</translation>
     </message>
@@ -411,171 +576,6 @@
         <source>of %1</source>
         <comment>number of pages</comment>
         <translation>/ %1 ページ</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupDialog.cpp"/>
-        <source>Page Setup</source>
-        <translation>ページ設定</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>As the report was &amp;made</source>
-        <translation>作成時のページのまま(&amp;M)</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>As the report was &amp;made (1 line)</source>
-        <translation>作成時のページのまま (1 行)(&amp;M)</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>As the report was &amp;made (%1 lines)</source>
-        <translation>作成時のページのまま (%1 行)(&amp;M)</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>P&amp;ortrait</source>
-        <translation>縦(&amp;O)</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>L&amp;andscape</source>
-        <translation>横(&amp;A)</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>As the &amp;sheet takes them</source>
-        <translation>用紙に入る行数で区切る(&amp;S)</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Pr&amp;inter:</source>
-        <translation>プリンター(&amp;P):</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Printer</source>
-        <translation>プリンター</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Pa&amp;per:</source>
-        <translation>用紙(&amp;Z):</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Paper</source>
-        <translation>用紙</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Orientation</source>
-        <translation>印刷の向き</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Margins</source>
-        <translation>余白</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>&amp;Left:</source>
-        <translation>左(&amp;L):</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>&amp;Top:</source>
-        <translation>上(&amp;T):</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>&amp;Right:</source>
-        <translation>右(&amp;R):</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>&amp;Bottom:</source>
-        <translation>下(&amp;B):</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Left margin</source>
-        <translation>左余白</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Top margin</source>
-        <translation>上余白</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Right margin</source>
-        <translation>右余白</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Bottom margin</source>
-        <translation>下余白</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source> mm</source>
-        <translation> mm</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Pages: %1</source>
-        <translation>ページ: %1</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Each page of the report is printed on a sheet of its own, in smaller type where it has to be.</source>
-        <translation>レポートの各ページを 1 枚ずつの用紙に印刷します。入りきらない場合は文字を小さくします。</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Each sheet takes as many lines as fit, and the next sheet goes on from there.</source>
-        <translation>各用紙に入るだけの行を印刷し、続きを次の用紙に印刷します。</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>Paper: %1 x %2 mm</source>
-        <translation>用紙: %1 x %2 mm</translation>
-    </message>
-    <message>
-        <location filename="../view/PageSetupForm.cpp"/>
-        <source>These margins leave no room for text on the paper. Choose smaller margins.</source>
-        <translation>余白が大きく、用紙に印字できる範囲がありません。余白を小さくしてください。</translation>
-    </message>
-    <message>
-        <location filename="../view/PrintDialogs.cpp"/>
-        <source>Print</source>
-        <translation>印刷</translation>
-    </message>
-    <message>
-        <location filename="../view/PrintDialogs.cpp"/>
-        <source>Print Preview</source>
-        <translation>印刷プレビュー</translation>
-    </message>
-    <message>
-        <location filename="../view/PrintProgress.cpp"/>
-        <source>Printing</source>
-        <translation>印刷中</translation>
-    </message>
-    <message>
-        <location filename="../view/PrintProgress.cpp"/>
-        <source>Cancel</source>
-        <translation>キャンセル</translation>
-    </message>
-    <message>
-        <location filename="../view/PrintProgress.cpp"/>
-        <source>Page %1 of %2</source>
-        <translation>ページ %1 / %2</translation>
-    </message>
-    <message>
-        <location filename="../view/PrintTarget.cpp"/>
-        <source>There is no room left for the pages.</source>
-        <translation>ページを保存する空き容量がありません。</translation>
     </message>
     <message>
         <location filename="../view/ReportEdit.cpp"/>
@@ -846,6 +846,451 @@
         <translation>→</translation>
     </message>
     <message>
+        <location filename="../sources/FileBytesPosix.cpp"/>
+        <source>the file was cut short while it was read</source>
+        <translation>読み込み中にファイルが切り詰められました</translation>
+    </message>
+    <message>
+        <location filename="../sources/FileBytesPosix.cpp"/>
+        <source>more than %1 MB come out of what is no file</source>
+        <translation>ファイルではない入力から %1 MB を超えるデータが読み込まれました</translation>
+    </message>
+    <message>
+        <location filename="../sources/RowBatches.cpp"/>
+        <source>there is not enough memory for the data</source>
+        <translation>データを読み込むメモリが足りません</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
+        <source>a whole number</source>
+        <translation>整数</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
+        <source>a text</source>
+        <translation>テキスト</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
+        <source>yes or no</source>
+        <translation>yes または no の値</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
+        <source>a station such as 12+345.678</source>
+        <translation>12+345.678 のような測点</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
+        <source>an angle such as 45-30-15</source>
+        <translation>45-30-15 のような角度</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
+        <source>a number</source>
+        <translation>数値</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvObjectList.cpp"/>
+        <source>a header row of variable names was expected</source>
+        <translation>変数名の見出し行が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvObjectList.cpp"/>
+        <source>the columns %1 and %2 are both named "%3": each variable was expected once</source>
+        <translation>列 %1 と列 %2 の名前がどちらも「%3」です: 変数はそれぞれ 1 回だけ指定できます</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvObjectList.cpp"/>
+        <source>no column of the header row is a variable of the dictionary: a header row of variable names, with the data's delimiter between them, was expected</source>
+        <translation>見出し行に辞書の変数がありません: 変数名をデータの区切り文字で区切った見出し行が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvObjectList.cpp"/>
+        <source>the row has %1 cells: %2 were expected, as in the header row</source>
+        <translation>行のセル数が %1 です: 見出し行と同じ %2 が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvObjectList.cpp"/>
+        <source>the cell "%1" of the column "%2" does not fit: %3 was expected</source>
+        <translation>列「%2」のセル「%1」が不正です: %3が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvReader.cpp"/>
+        <source>the file is not UTF-8</source>
+        <translation>ファイルが UTF-8 ではありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvReader.cpp"/>
+        <source>a delimiter was expected behind the closing quote</source>
+        <translation>終わりの引用符の後に区切り文字が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvReader.cpp"/>
+        <source>a quote inside a cell was not expected: the whole cell must stand in quotes and the quote be doubled</source>
+        <translation>セルの途中に引用符は使えません: セル全体を引用符で囲み、中の引用符を 2 つ重ねる必要があります</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvReader.cpp"/>
+        <source>a zero byte stands in the file: a text file was expected</source>
+        <translation>ファイルにヌルバイトがあります: テキストファイルが必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvReader.cpp"/>
+        <source>the quoted cell has no closing quote</source>
+        <translation>引用符で始まるセルに終わりの引用符がありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvReader.cpp"/>
+        <source>a carriage return without a line feed was not expected</source>
+        <translation>改行 (LF) を伴わない復帰 (CR) は使えません</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvReader.cpp"/>
+        <source>the row is longer than %1 bytes: a table of rows was expected</source>
+        <translation>行が %1 バイトを超えています: 行からなる表が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobList.cpp"/>
+        <source>standard input cannot be read: %1</source>
+        <translation>標準入力を読み込めません: %1</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobList.cpp"/>
+        <source>the list of jobs cannot be read: %1</source>
+        <translation>ジョブの一覧を読み込めません: %1</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobList.cpp"/>
+        <source>the list of jobs has lines and characters 0 as well: names on lines, or each ended by a character 0, were expected</source>
+        <translation>ジョブの一覧に改行と文字コード 0 が混在しています: 名前は 1 行に 1 つ、またはそれぞれ文字コード 0 で終わる必要があります</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>one of %1 was expected</source>
+        <translation>次のいずれかが必要です: %1</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>a list of four margins (left, top, right, bottom) was expected</source>
+        <translation>4 つの余白 (左、上、右、下) のリストが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>a character code or a text of one character was expected</source>
+        <translation>文字コードまたは 1 文字のテキストが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>a file name without a character 0 was expected</source>
+        <translation>文字コード 0 を含まないファイル名が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>either "csv" or "values" was expected</source>
+        <translation>"csv" と "values" のどちらか一方が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>an object or a list of objects was expected</source>
+        <translation>オブジェクトまたはオブジェクトのリストが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>a text of one ASCII character that is neither a quote nor a line end was expected</source>
+        <translation>引用符と改行を除く ASCII 1 文字のテキストが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>true was expected</source>
+        <translation>true が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>a step was expected: one of heading, line, lineFeed, newPage, block, table, clear</source>
+        <translation>heading, line, lineFeed, newPage, block, table, clear のいずれかのステップが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>a "%1" needs a template: the key "template" was expected in the job</source>
+        <translation>"%1" にはテンプレートが必要です: ジョブにキー "template" が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>the key "data" with the name of a data set was expected</source>
+        <translation>データセット名を値とするキー "data" が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>there is no data set named "%1" in the job</source>
+        <translation>ジョブに「%1」という名前のデータセットがありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>the key "report" with a list of steps was expected</source>
+        <translation>ステップのリストを値とするキー "report" が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>the key "file" was expected</source>
+        <translation>キー "file" が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>the ending of "%1" says no kind: the key "as" with one of %2 was expected</source>
+        <translation>「%1」の拡張子からは種類がわかりません: キー "as" に次のいずれかを指定する必要があります: %2</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>a text that begins with "%1" was expected</source>
+        <translation>「%1」で始まるテキストが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>a date and time such as 2024-03-05T14:07:00 was expected</source>
+        <translation>2024-03-05T14:07:00 のような日時が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>the key "%1" with a text was expected</source>
+        <translation>テキストを値とするキー "%1" が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>block</source>
+        <translation>ブロック</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>table</source>
+        <translation>表</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>the template has no %1 named "%2": one of %3 was expected</source>
+        <translation>テンプレートに「%2」という名前の%1がありません。使用できるもの: %3</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>none</source>
+        <translation>なし</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>the %1 "%2" cannot be written: the template has no dictionary named "%3"</source>
+        <translation>%1「%2」は出力できません: テンプレートに「%3」という名前の辞書がありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>the %1 "%2" cannot be written: the format of its field "%3" is beyond %4 characters</source>
+        <translation>%1「%2」は出力できません: フィールド「%3」の書式が %4 文字を超えています</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>the data file "%1" cannot be read: %2</source>
+        <translation>データファイル「%1」を読み込めません: %2</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>Reading %1</source>
+        <translation>読み込み中: %1</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>the data "%1" has no row: a block shows the first one</source>
+        <translation>データ「%1」に行がありません: ブロックには最初の行が表示されます</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>a row was expected behind the header row: a block shows the first one</source>
+        <translation>見出し行の後に行が必要です: ブロックには最初の行が表示されます</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>the report could not be made</source>
+        <translation>帳票を作成できませんでした</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>the margins leave no room on the page: smaller margins or a smaller font were expected</source>
+        <translation>余白が大きく、ページに印字できる範囲がありません: 余白またはフォントを小さくする必要があります</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobRunner.cpp"/>
+        <source>there is no template file "%1"</source>
+        <translation>テンプレートファイル「%1」がありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobSettingsReader.cpp"/>
+        <source>a list of three texts was expected</source>
+        <translation>3 つのテキストのリストが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobSettingsReader.cpp"/>
+        <source>one character with a code up to 255, or an empty text, was expected</source>
+        <translation>文字コード 255 以下の 1 文字または空のテキストが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>the key "%1" stands twice in "%2"</source>
+        <translation>キー「%1」が「%2」に 2 回あります</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>the file cannot be read: %1</source>
+        <translation>ファイルを読み込めません: %1</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>the file is larger than %1 MB: a job was expected</source>
+        <translation>ファイルが %1 MB を超えています: ジョブが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>a JSON object was expected: %1</source>
+        <translation>JSON オブジェクトが必要です: %1</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>a JSON object was expected</source>
+        <translation>JSON オブジェクトが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>the key "%1" stands in line %2 already: each key was expected once</source>
+        <translation>キー「%1」はすでに %2 行目にあります: キーはそれぞれ 1 回だけ指定できます</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>the key "%1" has %2 steps: at most %3 were expected</source>
+        <translation>キー「%1」は %2 段階です: %3 段階までです</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>there is no place for the key "%1" in the job</source>
+        <translation>ジョブにはキー "%1" を設定できません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>a text was expected</source>
+        <translation>テキストが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>true or false was expected</source>
+        <translation>true または false が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>a whole number from %1 to %2 was expected</source>
+        <translation>%1 から %2 までの整数が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>an object was expected</source>
+        <translation>オブジェクトが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>a list was expected</source>
+        <translation>リストが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonNode.cpp"/>
+        <source>unknown key "%1": %2 expected</source>
+        <translation>不明なキー "%1": 使用できるキー: %2</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonObjectList.cpp"/>
+        <source>the variable "%1" stands twice: each variable was expected once</source>
+        <translation>変数「%1」が 2 回あります: 変数はそれぞれ 1 回だけ指定できます</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JsonObjectList.cpp"/>
+        <source>the value of "%1" does not fit: %2 was expected</source>
+        <translation>「%1」の値が不正です: %2が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/OutputClash.cpp"/>
+        <source>"%1" is data of the job: an output of its own was expected</source>
+        <translation>"%1" はジョブのデータです: 別の出力が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/OutputClash.cpp"/>
+        <source>"%1" is the template of the job: an output of its own was expected</source>
+        <translation>"%1" はジョブのテンプレートです: 別の出力が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/OutputClash.cpp"/>
+        <source>"%1" is the job itself: an output of its own was expected</source>
+        <translation>"%1" はジョブそのものです: 別の出力が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/OutputClash.cpp"/>
+        <source>"%1" is the file of the output "%2" already: an output of its own was expected</source>
+        <translation>"%1" はすでに出力 "%2" のファイルです: 別の出力が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/OutputWriter.cpp"/>
+        <source>"%1" was not written: it would have more than %2</source>
+        <translation>"%1" は書き込まれませんでした: %2 を超えます</translation>
+    </message>
+    <message>
+        <location filename="../jobs/OutputWriter.cpp"/>
+        <source>the report could not be written to standard output: %1</source>
+        <translation>帳票を標準出力に書き込めませんでした: %1</translation>
+    </message>
+    <message>
+        <location filename="../jobs/OutputWriter.cpp"/>
+        <source>the report begins as rich text, but %1 (line %2, column %3)</source>
+        <translation>帳票はリッチテキストで始まっていますが、エラーがあります: %1 (%2 行 %3 桁)</translation>
+    </message>
+    <message>
+        <location filename="../jobs/OutputWriter.cpp"/>
+        <source>"%1" could not be written: %2</source>
+        <translation>「%1」に書き込めませんでした: %2</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TemplateSource.cpp"/>
+        <source>the template file cannot be read: there is no such file</source>
+        <translation>テンプレートファイルを読み込めません: ファイルがありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TemplateSource.cpp"/>
+        <source>a template file was expected; this is a folder, a pipe or a device</source>
+        <translation>テンプレートファイルが必要です。これはフォルダー、パイプ、またはデバイスです</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TemplateSource.cpp"/>
+        <source>the template file has %1 MB: at most %2 MB were expected</source>
+        <translation>テンプレートファイルが %1 MB あります: %2 MB 以下である必要があります</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TemplateSource.cpp"/>
+        <source>the template file cannot be read</source>
+        <translation>テンプレートファイルを読み込めません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TemplateSource.cpp"/>
+        <source>the template file is empty: a &lt;ReportTemplate&gt; element was expected</source>
+        <translation>テンプレートファイルが空です: &lt;ReportTemplate&gt; 要素が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TemplateSource.cpp"/>
+        <source>the template "%1" cannot be loaded: %2</source>
+        <translation>テンプレート「%1」を読み込めません: %2</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TemplateSource.cpp"/>
+        <source>the file holds no template: a &lt;ReportTemplate&gt; element was expected</source>
+        <translation>ファイルにテンプレートがありません: &lt;ReportTemplate&gt; 要素が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TemplateSource.cpp"/>
+        <source>there is no template named "%1": one of %2 was expected</source>
+        <translation>「%1」という名前のテンプレートがありません。使用できるもの: %2</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/CommandSetup.cpp"/>
         <source>--as: one of %1 was expected</source>
         <translation>--as: 次のいずれかが必要です: %1</translation>
@@ -889,376 +1334,6 @@
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>kareport: warning: "%1": %2</source>
         <translation>kareport: 警告: 「%1」: %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvObjectList.cpp"/>
-        <source>a header row of variable names was expected</source>
-        <translation>変数名の見出し行が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvObjectList.cpp"/>
-        <source>the columns %1 and %2 are both named "%3": each variable was expected once</source>
-        <translation>列 %1 と列 %2 の名前がどちらも「%3」です: 変数はそれぞれ 1 回だけ指定できます</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvObjectList.cpp"/>
-        <source>no column of the header row is a variable of the dictionary: a header row of variable names, with the data's delimiter between them, was expected</source>
-        <translation>見出し行に辞書の変数がありません: 変数名をデータの区切り文字で区切った見出し行が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvObjectList.cpp"/>
-        <source>the row has %1 cells: %2 were expected, as in the header row</source>
-        <translation>行のセル数が %1 です: 見出し行と同じ %2 が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvObjectList.cpp"/>
-        <source>the cell "%1" of the column "%2" does not fit: %3 was expected</source>
-        <translation>列「%2」のセル「%1」が不正です: %3が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvReader.cpp"/>
-        <source>the file is not UTF-8</source>
-        <translation>ファイルが UTF-8 ではありません</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvReader.cpp"/>
-        <source>a delimiter was expected behind the closing quote</source>
-        <translation>終わりの引用符の後に区切り文字が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvReader.cpp"/>
-        <source>a quote inside a cell was not expected: the whole cell must stand in quotes and the quote be doubled</source>
-        <translation>セルの途中に引用符は使えません: セル全体を引用符で囲み、中の引用符を 2 つ重ねる必要があります</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvReader.cpp"/>
-        <source>a zero byte stands in the file: a text file was expected</source>
-        <translation>ファイルにヌルバイトがあります: テキストファイルが必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvReader.cpp"/>
-        <source>the quoted cell has no closing quote</source>
-        <translation>引用符で始まるセルに終わりの引用符がありません</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvReader.cpp"/>
-        <source>a carriage return without a line feed was not expected</source>
-        <translation>改行 (LF) を伴わない復帰 (CR) は使えません</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CsvReader.cpp"/>
-        <source>the row is longer than %1 bytes: a table of rows was expected</source>
-        <translation>行が %1 バイトを超えています: 行からなる表が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/FileBytesPosix.cpp"/>
-        <source>the file was cut short while it was read</source>
-        <translation>読み込み中にファイルが切り詰められました</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/FileBytesPosix.cpp"/>
-        <source>more than %1 MB come out of what is no file</source>
-        <translation>ファイルではない入力から %1 MB を超えるデータが読み込まれました</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobList.cpp"/>
-        <source>standard input cannot be read: %1</source>
-        <translation>標準入力を読み込めません: %1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobList.cpp"/>
-        <source>the list of jobs cannot be read: %1</source>
-        <translation>ジョブの一覧を読み込めません: %1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobList.cpp"/>
-        <source>the list of jobs has lines and characters 0 as well: names on lines, or each ended by a character 0, were expected</source>
-        <translation>ジョブの一覧に改行と文字コード 0 が混在しています: 名前は 1 行に 1 つ、またはそれぞれ文字コード 0 で終わる必要があります</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>one of %1 was expected</source>
-        <translation>次のいずれかが必要です: %1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>a list of four margins (left, top, right, bottom) was expected</source>
-        <translation>4 つの余白 (左、上、右、下) のリストが必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>a character code or a text of one character was expected</source>
-        <translation>文字コードまたは 1 文字のテキストが必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>a file name without a character 0 was expected</source>
-        <translation>文字コード 0 を含まないファイル名が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>either "csv" or "values" was expected</source>
-        <translation>"csv" と "values" のどちらか一方が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>an object or a list of objects was expected</source>
-        <translation>オブジェクトまたはオブジェクトのリストが必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>a text of one ASCII character that is neither a quote nor a line end was expected</source>
-        <translation>引用符と改行を除く ASCII 1 文字のテキストが必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>true was expected</source>
-        <translation>true が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>a step was expected: one of heading, line, lineFeed, newPage, block, table, clear</source>
-        <translation>heading, line, lineFeed, newPage, block, table, clear のいずれかのステップが必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>a "%1" needs a template: the key "template" was expected in the job</source>
-        <translation>"%1" にはテンプレートが必要です: ジョブにキー "template" が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>the key "data" with the name of a data set was expected</source>
-        <translation>データセット名を値とするキー "data" が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>there is no data set named "%1" in the job</source>
-        <translation>ジョブに「%1」という名前のデータセットがありません</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>the key "report" with a list of steps was expected</source>
-        <translation>ステップのリストを値とするキー "report" が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>the key "file" was expected</source>
-        <translation>キー "file" が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>the ending of "%1" says no kind: the key "as" with one of %2 was expected</source>
-        <translation>「%1」の拡張子からは種類がわかりません: キー "as" に次のいずれかを指定する必要があります: %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>a text that begins with "%1" was expected</source>
-        <translation>「%1」で始まるテキストが必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>a date and time such as 2024-03-05T14:07:00 was expected</source>
-        <translation>2024-03-05T14:07:00 のような日時が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobReader.cpp"/>
-        <source>the key "%1" with a text was expected</source>
-        <translation>テキストを値とするキー "%1" が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>block</source>
-        <translation>ブロック</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>table</source>
-        <translation>表</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>the template has no %1 named "%2": one of %3 was expected</source>
-        <translation>テンプレートに「%2」という名前の%1がありません。使用できるもの: %3</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>none</source>
-        <translation>なし</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>the %1 "%2" cannot be written: the template has no dictionary named "%3"</source>
-        <translation>%1「%2」は出力できません: テンプレートに「%3」という名前の辞書がありません</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>the %1 "%2" cannot be written: the format of its field "%3" is beyond %4 characters</source>
-        <translation>%1「%2」は出力できません: フィールド「%3」の書式が %4 文字を超えています</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>the data file "%1" cannot be read: %2</source>
-        <translation>データファイル「%1」を読み込めません: %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>Reading %1</source>
-        <translation>読み込み中: %1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>the data "%1" has no row: a block shows the first one</source>
-        <translation>データ「%1」に行がありません: ブロックには最初の行が表示されます</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>a row was expected behind the header row: a block shows the first one</source>
-        <translation>見出し行の後に行が必要です: ブロックには最初の行が表示されます</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>the report could not be made</source>
-        <translation>帳票を作成できませんでした</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>the margins leave no room on the page: smaller margins or a smaller font were expected</source>
-        <translation>余白が大きく、ページに印字できる範囲がありません: 余白またはフォントを小さくする必要があります</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobRunner.cpp"/>
-        <source>there is no template file "%1"</source>
-        <translation>テンプレートファイル「%1」がありません</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobSettingsReader.cpp"/>
-        <source>a list of three texts was expected</source>
-        <translation>3 つのテキストのリストが必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobSettingsReader.cpp"/>
-        <source>one character with a code up to 255, or an empty text, was expected</source>
-        <translation>文字コード 255 以下の 1 文字または空のテキストが必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>the key "%1" stands twice in "%2"</source>
-        <translation>キー「%1」が「%2」に 2 回あります</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>the file cannot be read: %1</source>
-        <translation>ファイルを読み込めません: %1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>the file is larger than %1 MB: a job was expected</source>
-        <translation>ファイルが %1 MB を超えています: ジョブが必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>a JSON object was expected: %1</source>
-        <translation>JSON オブジェクトが必要です: %1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>a JSON object was expected</source>
-        <translation>JSON オブジェクトが必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>the key "%1" stands in line %2 already: each key was expected once</source>
-        <translation>キー「%1」はすでに %2 行目にあります: キーはそれぞれ 1 回だけ指定できます</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>the key "%1" has %2 steps: at most %3 were expected</source>
-        <translation>キー「%1」は %2 段階です: %3 段階までです</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>there is no place for the key "%1" in the job</source>
-        <translation>ジョブにはキー "%1" を設定できません</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>a text was expected</source>
-        <translation>テキストが必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>true or false was expected</source>
-        <translation>true または false が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>a whole number from %1 to %2 was expected</source>
-        <translation>%1 から %2 までの整数が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>an object was expected</source>
-        <translation>オブジェクトが必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>a list was expected</source>
-        <translation>リストが必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonNode.cpp"/>
-        <source>unknown key "%1": %2 expected</source>
-        <translation>不明なキー "%1": 使用できるキー: %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonObjectList.cpp"/>
-        <source>the variable "%1" stands twice: each variable was expected once</source>
-        <translation>変数「%1」が 2 回あります: 変数はそれぞれ 1 回だけ指定できます</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JsonObjectList.cpp"/>
-        <source>the value of "%1" does not fit: %2 was expected</source>
-        <translation>「%1」の値が不正です: %2が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputClash.cpp"/>
-        <source>"%1" is data of the job: an output of its own was expected</source>
-        <translation>"%1" はジョブのデータです: 別の出力が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputClash.cpp"/>
-        <source>"%1" is the template of the job: an output of its own was expected</source>
-        <translation>"%1" はジョブのテンプレートです: 別の出力が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputClash.cpp"/>
-        <source>"%1" is the job itself: an output of its own was expected</source>
-        <translation>"%1" はジョブそのものです: 別の出力が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputClash.cpp"/>
-        <source>"%1" is the file of the output "%2" already: an output of its own was expected</source>
-        <translation>"%1" はすでに出力 "%2" のファイルです: 別の出力が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputWriter.cpp"/>
-        <source>"%1" was not written: it would have more than %2</source>
-        <translation>"%1" は書き込まれませんでした: %2 を超えます</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputWriter.cpp"/>
-        <source>the report could not be written to standard output: %1</source>
-        <translation>帳票を標準出力に書き込めませんでした: %1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputWriter.cpp"/>
-        <source>the report begins as rich text, but %1 (line %2, column %3)</source>
-        <translation>帳票はリッチテキストで始まっていますが、エラーがあります: %1 (%2 行 %3 桁)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputWriter.cpp"/>
-        <source>"%1" could not be written: %2</source>
-        <translation>「%1」に書き込めませんでした: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputsWriter.cpp"/>
@@ -1369,81 +1444,6 @@
         <location filename="../apps/kareport/RenderJob.cpp"/>
         <source>kareport: stopped; nothing was written</source>
         <translation>kareport: 中断されました。何も書き込まれていません</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/RowBatches.cpp"/>
-        <source>there is not enough memory for the data</source>
-        <translation>データを読み込むメモリが足りません</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/TemplateSource.cpp"/>
-        <source>the template file cannot be read: there is no such file</source>
-        <translation>テンプレートファイルを読み込めません: ファイルがありません</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/TemplateSource.cpp"/>
-        <source>a template file was expected; this is a folder, a pipe or a device</source>
-        <translation>テンプレートファイルが必要です。これはフォルダー、パイプ、またはデバイスです</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/TemplateSource.cpp"/>
-        <source>the template file has %1 MB: at most %2 MB were expected</source>
-        <translation>テンプレートファイルが %1 MB あります: %2 MB 以下である必要があります</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/TemplateSource.cpp"/>
-        <source>the template file cannot be read</source>
-        <translation>テンプレートファイルを読み込めません</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/TemplateSource.cpp"/>
-        <source>the template file is empty: a &lt;ReportTemplate&gt; element was expected</source>
-        <translation>テンプレートファイルが空です: &lt;ReportTemplate&gt; 要素が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/TemplateSource.cpp"/>
-        <source>the template "%1" cannot be loaded: %2</source>
-        <translation>テンプレート「%1」を読み込めません: %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/TemplateSource.cpp"/>
-        <source>the file holds no template: a &lt;ReportTemplate&gt; element was expected</source>
-        <translation>ファイルにテンプレートがありません: &lt;ReportTemplate&gt; 要素が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/TemplateSource.cpp"/>
-        <source>there is no template named "%1": one of %2 was expected</source>
-        <translation>「%1」という名前のテンプレートがありません。使用できるもの: %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/ValueParser.cpp"/>
-        <source>a whole number</source>
-        <translation>整数</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/ValueParser.cpp"/>
-        <source>a text</source>
-        <translation>テキスト</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/ValueParser.cpp"/>
-        <source>yes or no</source>
-        <translation>yes または no の値</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/ValueParser.cpp"/>
-        <source>a station such as 12+345.678</source>
-        <translation>12+345.678 のような測点</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/ValueParser.cpp"/>
-        <source>an angle such as 45-30-15</source>
-        <translation>45-30-15 のような角度</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/ValueParser.cpp"/>
-        <source>a number</source>
-        <translation>数値</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ViewCommand.cpp"/>
