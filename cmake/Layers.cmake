@@ -22,10 +22,35 @@ if(KAREPORT_COVERAGE)
     target_link_options(ka_options INTERFACE --coverage)
 endif()
 
-# ka_layer(<target> LINKS <targets...> USES <libraries...> HEADERS <public...> PRIVATE_HEADERS <own...> SOURCES <...>)
+# Much of a build goes into reading the same headers again: they are compiled once for what sees Qt's core alone, and once
+# for what sees its windows as well. What is built for users is built without, so that every file names what it needs.
+set(KA_CORE_HEADERS
+    <QByteArray> <QDir> <QFile> <QFileInfo> <QHash> <QString> <QStringList> <QVariant> <algorithm> <functional> <memory>
+    <optional> <string> <utility> <variant> <vector>)
+set(KA_WIDGET_HEADERS ${KA_CORE_HEADERS} <QApplication> <QFont> <QPainter> <QWidget>)
+
+# ka_precompile(<target> <whether it sees Qt's windows>)
+function(ka_precompile target widgets)
+    set(owner ka_values_objects)
+    if(widgets)
+        set(owner ka_frame_objects)
+    endif()
+    target_compile_options(${target} PRIVATE $<$<CXX_COMPILER_ID:GNU>:-fpch-preprocess>) # for ccache
+    if(NOT target STREQUAL owner)
+        target_precompile_headers(${target} REUSE_FROM ${owner})
+    elseif(owner STREQUAL ka_values_objects)
+        target_precompile_headers(${target} PRIVATE ${KA_CORE_HEADERS})
+    else()
+        target_precompile_headers(${target} PRIVATE ${KA_WIDGET_HEADERS})
+    endif()
+endfunction()
+
+# ka_layer(<target> LINKS <targets...> USES <libraries...> HEADERS <public...> PRIVATE_HEADERS <own...> SOURCES <...>
+#          [WIDGETS])
 #
 # A folder of the module or of the host. LINKS are the layers below and what the headers need of other libraries; USES is
 # what the sources alone need. HEADERS are installed; PRIVATE_HEADERS serve the layers above inside this project only.
+# WIDGETS says that the sources see Qt's windows.
 #
 # Three targets are made, as the same code is linked in two ways:
 #   <target>_api      the headers of this layer and of those below it; nothing is linked by it
@@ -33,15 +58,18 @@ endif()
 #   <target>          the layer and those below it as static libraries, for what must see more than the shared libraries
 #                     offer: tests and benchmarks
 function(ka_layer target)
-    cmake_parse_arguments(arg "" "" "LINKS;USES;HEADERS;PRIVATE_HEADERS;SOURCES" ${ARGN})
+    cmake_parse_arguments(arg "WIDGETS" "" "LINKS;USES;HEADERS;PRIVATE_HEADERS;SOURCES" ${ARGN})
     ka_apis(apis ${arg_LINKS})
     add_library(${target}_api INTERFACE)
     target_include_directories(${target}_api INTERFACE ${CMAKE_CURRENT_SOURCE_DIR})
     target_link_libraries(${target}_api INTERFACE ${apis})
 
     add_library(${target}_objects OBJECT ${arg_SOURCES})
-    target_compile_definitions(${target}_objects PRIVATE KAREPORT_BUILDING)
+    # Not of the target: the compiled headers serve what is outside the libraries as well.
+    set_source_files_properties(${arg_SOURCES} PROPERTIES COMPILE_DEFINITIONS KAREPORT_BUILDING)
     target_link_libraries(${target}_objects PUBLIC ${target}_api ${arg_USES} PRIVATE ka_options ka_hardening)
+
+    ka_precompile(${target}_objects "${arg_WIDGETS}")
 
     add_library(${target} STATIC)
     target_link_libraries(${target} PUBLIC ${target}_objects ${target}_api ${arg_LINKS} ${arg_USES})
@@ -51,17 +79,18 @@ function(ka_layer target)
     set_property(TARGET ${target} PROPERTY KA_INSTALLED_HEADERS ${arg_HEADERS})
 endfunction()
 
-# ka_outer_layer(<target> LINKS <targets...> HEADERS <...> SOURCES <...>)
+# ka_outer_layer(<target> LINKS <targets...> HEADERS <...> SOURCES <...> [WIDGETS])
 #
 # A folder around the module, which the programs share: a static library. It sees the headers of the layers that it names,
 # and is linked with the module as the program at the end wants it (ka_module).
 function(ka_outer_layer target)
-    cmake_parse_arguments(arg "" "" "LINKS;HEADERS;SOURCES" ${ARGN})
+    cmake_parse_arguments(arg "WIDGETS" "" "LINKS;HEADERS;SOURCES" ${ARGN})
     ka_apis(apis ${arg_LINKS})
     add_library(${target} STATIC ${arg_SOURCES})
     target_sources(${target} PUBLIC FILE_SET HEADERS BASE_DIRS ${CMAKE_CURRENT_SOURCE_DIR} FILES ${arg_HEADERS})
     target_include_directories(${target} PUBLIC ${CMAKE_CURRENT_SOURCE_DIR})
     target_link_libraries(${target} PUBLIC ${apis} $<LINK_ONLY:ka_module> PRIVATE ka_options ka_hardening)
+    ka_precompile(${target} "${arg_WIDGETS}")
 endfunction()
 
 # The layers of the module among some targets, as their headers alone.

@@ -2,6 +2,7 @@
 
 #include "FailingMemory.h"
 #include "PageWriter.h"
+#include "ReportTextCodec.h"
 #include "ShortenedSteps.h"
 
 #include <QBuffer>

@@ -1,5 +1,6 @@
 #include "CsvReader.h"
 
+#include "InputErrorText.h"
 #include "JobFolder.h"
 
 #include <gmock/gmock.h>

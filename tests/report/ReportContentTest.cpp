@@ -4,6 +4,7 @@
 #include "ReportContent.h"
 
 #include <QFontMetricsF>
+#include <QTemporaryDir>
 #include <QTextBlock>
 #include <QTextDocument>
 

@@ -1,6 +1,6 @@
 #include "CsvFile.h"
-
 #include "FileBytes.h"
+#include "InputErrorText.h"
 #include "Interrupt.h"
 
 #include <fcntl.h>

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "InputError.h"
 #include "PrintQt.h"
 
 #include <QByteArray>
@@ -10,8 +9,6 @@
 #include <QTemporaryDir>
 
 #include <gtest/gtest.h>
-
-#include <optional>
 
 /// A folder for the files of one test.
 class JobFolder
@@ -38,22 +35,6 @@ public:
 private:
     QTemporaryDir folder_;
 };
-
-/// A place as "line:column", or "none".
-inline QString placeText(const std::optional<kareport::TextPlace> &place)
-{
-    return place ? QStringLiteral("%1:%2").arg(place->line).arg(place->column) : QStringLiteral("none");
-}
-
-inline QString placeText(const std::optional<kareport::InputError> &error)
-{
-    return error ? placeText(error->place) : QStringLiteral("no error");
-}
-
-inline QString textOfError(const std::optional<kareport::InputError> &error)
-{
-    return error ? error->text : QString();
-}
 
 /// A text in which "@" marks a place.
 struct MarkedText

@@ -1,4 +1,5 @@
 #include "CsvFile.h"
+#include "InputErrorText.h"
 
 #include <gtest/gtest.h>
 

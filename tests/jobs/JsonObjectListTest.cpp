@@ -1,5 +1,6 @@
 #include "JsonObjectList.h"
 
+#include "InputErrorText.h"
 #include "JobFolder.h"
 #include "VariableType.h"
 

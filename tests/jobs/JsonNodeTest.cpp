@@ -1,5 +1,6 @@
 #include "JsonNode.h"
 
+#include "InputErrorText.h"
 #include "JobFolder.h"
 
 #include <QJsonDocument>

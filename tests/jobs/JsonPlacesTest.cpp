@@ -1,5 +1,6 @@
 #include "JsonPlaces.h"
 
+#include "InputErrorText.h"
 #include "JobFolder.h"
 
 #include <gtest/gtest.h>

@@ -1,5 +1,6 @@
 #include "JobList.h"
 
+#include "InputErrorText.h"
 #include "JobFolder.h"
 
 #include <gtest/gtest.h>

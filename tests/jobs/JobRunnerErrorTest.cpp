@@ -1,3 +1,4 @@
+#include "InputErrorText.h"
 #include "JobRunnerFixture.h"
 
 namespace

@@ -1,5 +1,6 @@
 #include "ReportFixture.h"
 
+#include <QBuffer>
 #include <QTemporaryDir>
 
 #include <gtest/gtest.h>
