@@ -81,15 +81,24 @@ endfunction()
 
 # ka_outer_layer(<target> LINKS <targets...> HEADERS <...> SOURCES <...> [WIDGETS])
 #
-# A folder around the module, which the programs share: a static library. It sees the headers of the layers that it names,
-# and is linked with the module as the program at the end wants it (ka_module).
+# A folder around the module, which the programs share: a static library, and its headers alone as <target>_api. It sees
+# the headers of the layers that it names, and is linked with the module as the program at the end wants it (ka_module).
 function(ka_outer_layer target)
     cmake_parse_arguments(arg "WIDGETS" "" "LINKS;HEADERS;SOURCES" ${ARGN})
     ka_apis(apis ${arg_LINKS})
+    add_library(${target}_api INTERFACE)
+    target_include_directories(${target}_api INTERFACE ${CMAKE_CURRENT_SOURCE_DIR})
+    target_link_libraries(${target}_api INTERFACE ${apis})
+
     add_library(${target} STATIC ${arg_SOURCES})
     target_sources(${target} PUBLIC FILE_SET HEADERS BASE_DIRS ${CMAKE_CURRENT_SOURCE_DIR} FILES ${arg_HEADERS})
-    target_include_directories(${target} PUBLIC ${CMAKE_CURRENT_SOURCE_DIR})
-    target_link_libraries(${target} PUBLIC ${apis} $<LINK_ONLY:ka_module> PRIVATE ka_options ka_hardening)
+    set(outer)
+    foreach(link IN LISTS arg_LINKS)
+        if(NOT TARGET ${link}_objects) # a layer of the module comes with it
+            list(APPEND outer ${link})
+        endif()
+    endforeach()
+    target_link_libraries(${target} PUBLIC ${target}_api ${outer} $<LINK_ONLY:ka_module> PRIVATE ka_options ka_hardening)
     ka_precompile(${target} "${arg_WIDGETS}")
 endfunction()
 

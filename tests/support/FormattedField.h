@@ -15,26 +15,10 @@ struct FormattedField
     kareport::FormatOptions options;
     QString suffix;
 
-    FormattedField(int type, int width, int decimals = 0, const char *align = "R")
-    {
-        field.VariableName = QStringLiteral("V");
-        field.Type = type;
-        field.Width = width;
-        field.Decimals = decimals;
-        field.Align = QString::fromLatin1(align);
-    }
+    FormattedField(int type, int width, int decimals = 0, const char *align = "R");
 
     /// The text of what a pointer of a kind points to.
-    QString of(int kind, const void *value) const
-    {
-        kareport::FormatOptions used = options;
-        used.settings = &settings;
-        kareport::TextBuffer out;
-        out.append(u"before");
-        kareport::FieldFormatter(field).append(out, used, kind, value, suffix);
-        return out.from(0).startsWith(u"before") ? out.from(6).toString()
-                                                 : QStringLiteral("what stood there before was changed");
-    }
+    QString of(int kind, const void *value) const;
 
     QString of(double value) const { return of(8, &value); }
     QString of(qint32 value) const { return of(4, &value); }

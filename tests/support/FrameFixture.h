@@ -24,12 +24,7 @@ class FrameLog
 {
 public:
     FrameLog() = default;
-    ~FrameLog()
-    {
-        while (!panes.empty()) {
-            panes.back()->ClosePane();
-        }
-    }
+    ~FrameLog();
     FrameLog(const FrameLog &) = delete;
     FrameLog &operator=(const FrameLog &) = delete;
 
@@ -46,27 +41,9 @@ public:
     ~TextDocument() override { --log_.documents; }
 
     bool OnNewDocument() override { return makes && UDocument::OnNewDocument(); }
-    void Serialize(UArchive &archive) override
-    {
-        archivePath = archive.GetFilePath();
-        archiveLength = archive.GetLength();
-        wasModifiedMeanwhile = IsModified();
-        if (archive.IsStoring()) {
-            archive.Write(content);
-            return;
-        }
-        QFile file(archive.GetFilePath());
-        content = file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
-        if (content.startsWith("broken")) {
-            archive.Write("a write into a file that is read fails");
-        }
-    }
+    void Serialize(UArchive &archive) override;
     void DeleteContents() override { content.clear(); }
-    void OnDocumentEvent(DocumentEvent event) override
-    {
-        static const char *const names[] = {"new", "open", "save", "close"};
-        log_.events.append(QLatin1String(names[static_cast<int>(event)]));
-    }
+    void OnDocumentEvent(DocumentEvent event) override;
     using UDocument::CloseAllPanes;
 
     QByteArray content;
@@ -91,10 +68,7 @@ public:
         bool operator==(const Update &) const = default;
     };
 
-    void OnUpdate(UView *sender, long hint, void *hintObject) override
-    {
-        updates.push_back({sender, hint, hintObject});
-    }
+    void OnUpdate(UView *sender, long hint, void *hintObject) override;
 
     std::vector<Update> updates;
 };
@@ -115,57 +89,23 @@ private:
 };
 
 /// Puts a new view of a document into a pane.
-inline RecordingView *addRecordingView(CViewPane &pane, UDocument &document)
-{
-    auto view = std::make_unique<RecordingView>();
-    RecordingView *shown = view.get();
-    pane.AddView(std::move(view));
-    document.AddView(shown);
-    return shown;
-}
+RecordingView *addRecordingView(CViewPane &pane, UDocument &document);
 
 /// A visible pane with a view of a document.
-inline RecordingPane *openRecordingPane(FrameLog &log, UDocument &document)
-{
-    auto *pane = new RecordingPane(log);
-    pane->ShowPane(true);
-    addRecordingView(*pane, document);
-    document.UpdateFrameCounts();
-    return pane;
-}
+RecordingPane *openRecordingPane(FrameLog &log, UDocument &document);
 
-inline RecordingView *viewOf(const CViewPane *pane, std::size_t index = 0)
-{
-    return static_cast<RecordingView *>(pane->GetViews().at(index).get());
-}
+RecordingView *viewOf(const CViewPane *pane, std::size_t index = 0);
 
-inline QStringList paneCaptions()
-{
-    QStringList captions;
-    CViewPane::GetPaneCaptions(captions);
-    return captions;
-}
+QStringList paneCaptions();
 
 /// An application with one document template. It must go before its log.
 class TextApplication : public UApplication
 {
 public:
-    explicit TextApplication(FrameLog &log, bool withWindows = true)
-        : texts_(AddDocTemplate(std::make_unique<UDocTemplate>(
-              128, [&log] { return std::make_unique<TextDocument>(log); },
-              withWindows ? UDocTemplate::PaneFactory([&log] { return new RecordingPane(log); })
-                          : UDocTemplate::PaneFactory(),
-              withWindows ? UDocTemplate::ViewFactory([] { return std::make_unique<RecordingView>(); })
-                          : UDocTemplate::ViewFactory(),
-              QStringLiteral("Texts"), 1, 1)))
-    {}
+    explicit TextApplication(FrameLog &log, bool withWindows = true);
 
     UDocTemplate &texts() const { return *texts_; }
-    TextDocument *open(const QString &path = QString(), CViewPane *pane = nullptr, int makeVisible = 1) const
-    {
-        return static_cast<TextDocument *>(
-            texts_->OpenReportDocumentFile(path, makeVisible, makeVisible, pane, 0, nullptr));
-    }
+    TextDocument *open(const QString &path = QString(), CViewPane *pane = nullptr, int makeVisible = 1) const;
 
 private:
     UDocTemplate *texts_;
@@ -175,14 +115,7 @@ private:
 class AnsweredMessages
 {
 public:
-    explicit AnsweredMessages(MessageAnswer answer)
-    {
-        kareport::setMessageHandler([this, answer](const QString &text, MessageButtons buttons) {
-            texts.append(text);
-            asked.push_back(buttons);
-            return answer;
-        });
-    }
+    explicit AnsweredMessages(MessageAnswer answer);
     ~AnsweredMessages() { kareport::setMessageHandler({}); }
     AnsweredMessages(const AnsweredMessages &) = delete;
     AnsweredMessages &operator=(const AnsweredMessages &) = delete;
@@ -191,16 +124,6 @@ public:
     std::vector<MessageButtons> asked;
 };
 
-inline std::string contentOf(const QString &path)
-{
-    QFile file(path);
-    return file.open(QIODevice::ReadOnly) ? file.readAll().toStdString() : "(cannot be read)";
-}
+std::string contentOf(const QString &path);
 
-inline void putFile(const QString &path, const QByteArray &content)
-{
-    QFile file(path);
-    if (file.open(QIODevice::WriteOnly)) {
-        file.write(content);
-    }
-}
+void putFile(const QString &path, const QByteArray &content);

@@ -8,17 +8,8 @@
 #include <optional>
 
 /// A place as "line:column", or "none".
-inline QString placeText(const std::optional<kareport::TextPlace> &place)
-{
-    return place ? QStringLiteral("%1:%2").arg(place->line).arg(place->column) : QStringLiteral("none");
-}
+QString placeText(const std::optional<kareport::TextPlace> &place);
 
-inline QString placeText(const std::optional<kareport::InputError> &error)
-{
-    return error ? placeText(error->place) : QStringLiteral("no error");
-}
+QString placeText(const std::optional<kareport::InputError> &error);
 
-inline QString textOfError(const std::optional<kareport::InputError> &error)
-{
-    return error ? error->text : QString();
-}
+QString textOfError(const std::optional<kareport::InputError> &error);

@@ -15,26 +15,7 @@ namespace jobs
 
 /// A template "T" of the title "Title". Tables: "Points" (number and northing), "Sorted" (the same by northing, then
 /// number), "Stations", and "Lost", whose dictionary is missing. Blocks: "Site" and "Point".
-inline QByteArray pointsTemplate(const char *title = "Title")
-{
-    using namespace markup;
-    const QByteArray site = element(
-        "Dictionary", element("DictionaryName", "Site") +
-                          element("VariableList", joined({variable(1, "Client", "TEXT"), variable(2, "Area", "AREA"),
-                                                          variable(3, "Bearing", "BEARING")})));
-    const std::vector<QByteArray> points = {field("Number", "Pt", "5"), field("Northing", "North", "9.3", "RIGHT")};
-    const QByteArray tables = output("Table", "Points", "Survey", points) +
-                              output("Table", "Sorted", "Survey", points, {"Northing", "Number"}) +
-                              output("Table", "Stations", "Survey", {field("Chainage", "Chainage", "12.3", "RIGHT")}) +
-                              output("Table", "Lost", "Nowhere", points);
-    const QByteArray blocks =
-        output("Block", "Site", "Site",
-               {field("Client", "Client", "0"), field("Area", "Area", "0.3"), field("Bearing", "Bearing", "0")}) +
-        output("Block", "Point", "Survey", points);
-    return element("ReportTemplate", element("Name", "T") + element("Title", title) + element("Tables", tables) +
-                                         element("Dictionaries", surveyDictionary() + site) +
-                                         element("Blocks", blocks) + element("Options", separatorOption("124")));
-}
+QByteArray pointsTemplate(const char *title = "Title");
 
 /// What a job file's text begins with: a fixed time and page.
 inline const char *const fixedFront =
@@ -48,35 +29,11 @@ public:
 
     /// Runs a job of this content behind `fixedFront`.
     void run(const QByteArray &content) { runWhole(fixedFront + content + '}'); }
-    void runWhole(const QByteArray &json)
-    {
-        runner_.reset();
-        error.reset();
-        folder.put("job.json", json);
-        auto read = kareport::JsonSource::read(folder.path("job.json"));
-        if (const auto *wrong = kareport::errorOf(read)) {
-            error = *wrong;
-            return;
-        }
-        source_ = std::make_unique<kareport::JsonSource>(std::get<kareport::JsonSource>(std::move(read)));
-        job_ = kareport::readJob(*source_);
-        error = source_->error();
-        if (error) {
-            return;
-        }
-        runner_ = std::make_unique<kareport::JobRunner>(job_, *source_, progress_);
-        error = runner_->run();
-    }
+    void runWhole(const QByteArray &json);
 
     UReportDoc &report() { return runner_->report(); }
     /// The report's text with LF for its line ends; the message when there is none.
-    QString text()
-    {
-        if (error) {
-            return error->message();
-        }
-        return report().GetText().toString().replace(QStringLiteral("\r\n"), QStringLiteral("\n"));
-    }
+    QString text();
 
 private:
     FixedSurroundings surroundings_;

@@ -29,11 +29,7 @@ private:
 /// A template of a name, loaded from a file of this content.
 struct LoadedTemplate
 {
-    explicit LoadedTemplate(const QByteArray &content, const QString &name = QStringLiteral("T"))
-    {
-        const TemplateOnDisk file(content);
-        loaded = file.written() && tpl.LoadTemplate(file.path(), name);
-    }
+    explicit LoadedTemplate(const QByteArray &content, const QString &name = QStringLiteral("T"));
 
     UXmlReportTpl tpl;
     bool loaded = false;

@@ -13,44 +13,15 @@ class ModelledReport
 {
 public:
     /// @param clipboard  what was cut last, in any report
-    explicit ModelledReport(QString &clipboard) : model_(headerOf(QString(), 0).chopped(3)), clip_(clipboard)
-    {
-        shown_.report.FixPage(9, 80);
-        model_.setLinesPerPage(9);
-        openView(false);
-    }
+    explicit ModelledReport(QString &clipboard);
     ModelledReport(const ModelledReport &) = delete;
     ModelledReport &operator=(const ModelledReport &) = delete;
 
     /// @return what is wrong afterwards; empty when nothing is
-    QString carryOut(const ReportStep &step)
-    {
-        const QString textBefore = model_.text();
-        const std::vector<qint64> startsBefore = model_.starts();
-        const bool isUser = step.op >= ReportOp::Type && step.op <= ReportOp::TakeAll;
-        editsSeen_ = 0;
-        isUser ? actAsUser(step) : step.op >= ReportOp::HidePane ? actOnPanes(step) : actAsHost(step);
-        QString wrong = compare();
-        if (wrong.isEmpty() && step.op == ReportOp::Undo && canUndoExactly_ && editsSeen_ > 0 &&
-            model_.text() == beforeEdit_ && model_.starts() != startsBeforeEdit_)
-        {
-            wrong =
-                QStringLiteral("undone: pages %1 and not %2").arg(joined(model_.starts()), joined(startsBeforeEdit_));
-        }
-        canUndoExactly_ = isUser && step.op != ReportOp::Undo && step.op != ReportOp::Redo &&
-                          step.op != ReportOp::TakeAll && editsSeen_ == 1;
-        beforeEdit_ = textBefore;
-        startsBeforeEdit_ = startsBefore;
-        return wrong;
-    }
+    QString carryOut(const ReportStep &step);
 
     /// @return what is wrong with it, as after a step with another report; empty when nothing is
-    QString compare()
-    {
-        const QString text = model_.text();
-        const QString wrong = compareReport(text);
-        return wrong.isEmpty() ? compareViews(text) : wrong;
-    }
+    QString compare();
 
 private:
     UReportDoc &report() { return shown_.report; }
@@ -66,407 +37,49 @@ private:
     void openView(bool inPieces) { views_.push_back({&shown_.open(inPieces)}); }
 
     /// The view that a user works in; null when all are hidden.
-    UReportView *visibleView(int number) const
-    {
-        std::vector<UReportView *> visible;
-        for (const Shown &shown : views_) {
-            if (!shown.isHidden) {
-                visible.push_back(shown.view);
-            }
-        }
-        return visible.empty() ? nullptr : visible[std::size_t(number) % visible.size()];
-    }
+    UReportView *visibleView(int number) const;
 
-    void tellViews()
-    {
-        report().UpdateAllViews(nullptr, 0, nullptr);
-        for (Shown &shown : views_) {
-            shown.isStale = false;
-        }
-    }
+    void tellViews();
 
-    static QString line(int seed)
-    {
-        static const QStringList lines = {QString(),
-                                          QStringLiteral("a"),
-                                          QStringLiteral("12.345  67.890"),
-                                          QStringLiteral("  "),
-                                          QStringLiteral("\u2126 ohm"),
-                                          QStringLiteral("two\r\nlines"),
-                                          QStringLiteral("\r\n"),
-                                          headerOf(QString(), 7)};
-        return lines[seed % lines.size()];
-    }
+    static QString line(int seed);
 
-    static QString data(int seed)
-    {
-        QString text;
-        for (int i = 0; i < seed % 23; ++i) {
-            text += line(seed / 7 + i * 3) + (seed % 5 == 1 ? QStringLiteral("\n") : QStringLiteral("\r\n"));
-        }
-        return seed % 3 == 0 ? text + QStringLiteral("end") : text;
-    }
+    static QString data(int seed);
 
-    void actAsHost(const ReportStep &step)
-    {
-        switch (step.op) {
-        case ReportOp::WriteLine: {
-            const int before = step.a % 4 - 1;
-            const int after = step.b % 12 == 11 ? 30 : step.b % 4;
-            report().WriteLine(line(step.c), before, after, step.c % 4);
-            model_.writeLine(line(step.c), before, after);
-            isModified_ = true;
-            break;
-        }
-        case ReportOp::Write:
-            report().Write(line(step.c), 0);
-            model_.write(line(step.c));
-            isModified_ = isModified_ || !line(step.c).isEmpty();
-            break;
-        case ReportOp::LineFeed: {
-            const int count = step.a % 8 == 7 ? 25 : step.a % 5 - 1;
-            report().LineFeed(count);
-            model_.lineFeed(count);
-            isModified_ = isModified_ || count > 0;
-            break;
-        }
-        case ReportOp::NewPage: {
-            const int needed = step.a % 2 == 0 ? -1 : step.b % 12;
-            const qint64 before = model_.size();
-            const bool isNew = report().NewPage(needed);
-            wrongAnswer_ = wrongAnswer_ || isNew != model_.newPage(needed);
-            isModified_ = isModified_ || model_.size() > before || (isNew && report().GetHeaderFlag());
-            break;
-        }
-        case ReportOp::Table:
-            for (int i = 0; i < step.a % 15; ++i) {
-                const QString row = QStringLiteral("%1  %2").arg(i, 4).arg(i * 1.25);
-                report().WriteLine(row, 0, 1, 0);
-                model_.writeLine(row, 0, 1);
-                isModified_ = true;
-            }
-            break;
-        case ReportOp::Heading: {
-            const QString heading = line(step.c % 7);
-            report().SetHeading(heading, step.a % 3, step.b % 3);
-            model_.setHeading(heading, step.a % 3, step.b % 3);
-            if (step.c % 2 == 0) {
-                report().WriteHeading();
-                model_.writeHeading();
-                isModified_ = true;
-            }
-            break;
-        }
-        case ReportOp::HeaderFlag:
-            report().SetHeaderFlag(step.a % 2 == 0);
-            model_.setHeaderFlag(step.a % 2 == 0);
-            break;
-        case ReportOp::LinesPerPage: {
-            const int lines = step.a % 12 + 1;
-            report().FixPage(lines, 80);
-            model_.setLinesPerPage(lines);
-            break;
-        }
-        case ReportOp::SetData:
-            report().SetData(data(step.c));
-            model_.setData(data(step.c));
-            break;
-        case ReportOp::Clear:
-            report().Clear();
-            model_.clear();
-            isModified_ = true;
-            break;
-        case ReportOp::RichText: actInRichText(step); break;
-        case ReportOp::OpenView:
-            if (views_.size() < 3) {
-                openView(step.b % 2 == 0);
-            }
-            return;
-        case ReportOp::CloseView:
-            if (views_.size() > 1) {
-                shown_.close(std::size_t(step.a) % views_.size());
-                views_.erase(views_.begin() + step.a % static_cast<int>(views_.size()));
-            }
-            return;
-        case ReportOp::Reload: reload(); break;
-        default: return;
-        }
-        tellViews();
-    }
+    void actAsHost(const ReportStep &step);
 
     /// What has nothing to do with a text: panes, and what goes on by itself.
-    void actOnPanes(const ReportStep &step)
-    {
-        Shown &shown = views_[std::size_t(step.a) % views_.size()];
-        switch (step.op) {
-        case ReportOp::HidePane:
-            shown.isHidden = true;
-            shown.view->GetParentPane()->ShowPane(false);
-            shown.view->GetWidget()->hide();
-            break;
-        case ReportOp::ShowPane:
-            shown.view->GetParentPane()->ShowPane(true);
-            shown.view->GetWidget()->show();
-            shown.isStale = shown.isStale && !shown.isHidden; // what is shown again is loaded where it is another text
-            shown.isHidden = false;
-            break;
-        case ReportOp::WriteUnseen: writeUnseen(step); break;
-        case ReportOp::SetLongData: {
-            const QString text = longText(step.c);
-            report().SetData(text);
-            model_.setData(text);
-            tellViews();
-            break;
-        }
-        case ReportOp::GoOn:
-            for (int i = 0; i <= step.b % 3; ++i) {
-                QCoreApplication::processEvents();
-            }
-            break;
-        case ReportOp::NeedAll: needAll(shown, step.c); break;
-        default: break;
-        }
-    }
+    void actOnPanes(const ReportStep &step);
 
     /// A host that does not tell the views.
-    void writeUnseen(const ReportStep &step)
-    {
-        if (step.b % 3 == 0) {
-            report().ReplaceText(0, 0, u"Z");
-            model_.replace(0, 0, QStringLiteral("Z"));
-        } else {
-            report().WriteLine(line(step.c), 0, 1, 0);
-            model_.writeLine(line(step.c), 0, 1);
-        }
-        isModified_ = true;
-        for (Shown &shown : views_) {
-            shown.isStale = true;
-        }
-    }
+    void writeUnseen(const ReportStep &step);
 
     /// Whatever needs the whole text does not wait for the pieces.
-    void needAll(Shown &shown, int seed)
-    {
-        UReportView &view = *shown.view;
-        if (shown.isStale) {
-            tellViews();
-        }
-        QBuffer device;
-        device.open(QIODevice::WriteOnly);
-        switch (seed % 5) {
-        case 0: widgetOf(view).goToPage(1 + seed % 9); break;
-        case 1: wrongAnswer_ = wrongAnswer_ || !view.streamPlainText(device); break;
-        case 2: view.UpdateData(true); break;
-        case 3:
-            widgetOf(view).openPageBar();
-            QTest::keyClick(&view.GetEdit(), Qt::Key_Escape);
-            break;
-        default: QTest::keyClick(&view.GetEdit(), Qt::Key_End, Qt::ControlModifier); break;
-        }
-        wrongAnswer_ = wrongAnswer_ || view.GetEdit().isLoading();
-    }
+    void needAll(Shown &shown, int seed);
 
     /// Long enough to be loaded in pieces.
-    static QString longText(int seed)
-    {
-        QString text;
-        for (int number = 1; number <= 6000; ++number) {
-            text += seed % 2 == 0 && number % 60 == 1
-                        ? headerOf(QString(), number / 60 + 1)
-                        : QStringLiteral("point %1 of %2").arg(number, 6).arg(seed).leftJustified(90, u'.');
-            text += QStringLiteral("\r\n");
-        }
-        return text;
-    }
+    static QString longText(int seed);
 
-    void reload()
-    {
-        const QString path = folder_.filePath(QStringLiteral("a.rep"));
-        if (report().IsEmpty() || model_.text().contains(QStringLiteral("\n\n")) || !isAllCrLf()) {
-            return; // such a file comes back with other line ends
-        }
-        report().SetPathName(path, false);
-        wrongAnswer_ = wrongAnswer_ || !report().OnSaveDocument(path) || report().IsModified() ||
-                       !kareport::reloadSavedReport(report());
-        model_.reload(model_.text());
-        model_.setLinesPerPage(report().GetLinesPerPage());
-        isModified_ = false;
-    }
+    void reload();
 
-    bool isAllCrLf() const
-    {
-        const QString text = model_.text();
-        return text.count(u'\n') == text.count(QStringLiteral("\r\n")) &&
-               text.count(u'\r') == text.count(QStringLiteral("\r\n"));
-    }
+    bool isAllCrLf() const;
 
     /// Rich-text mode on, something written and typed, and off again: what was typed is then the report's text.
-    void actInRichText(const ReportStep &step)
-    {
-        if (visibleView(step.b) == nullptr) {
-            return;
-        }
-        report().Clear();
-        model_.clear();
-        report().SetRTFDataFlag(true);
-        for (int i = 0; i < step.a % 20; ++i) {
-            report().WriteLine(line(1 + i % 3), 0, 1, i % 4);
-            model_.writeLine(line(1 + i % 3), 0, 1);
-        }
-        report().UpdateAllViews(nullptr, 0, nullptr);
-        kareport::ReportEdit &edit = visibleView(step.b)->GetEdit();
-        putCursor(edit, step.c % std::max(1, edit.document()->characterCount()));
-        QTest::keyClick(&edit, step.c % 2 == 0 ? Qt::Key_X : Qt::Key_Return);
-        report().SetRTFDataFlag(false);
-        // The image ends its last paragraph without a line end of its own: the text is the control's.
-        followText(edit);
-        isModified_ = true;
-    }
+    void actInRichText(const ReportStep &step);
 
-    void followText(kareport::ReportEdit &edit)
-    {
-        const std::vector<qint64> starts = report().GetPageStarts();
-        model_.setData(edit.windowText());
-        if (starts != model_.starts()) {
-            model_.adoptStarts(starts);
-        }
-    }
+    void followText(kareport::ReportEdit &edit);
 
-    void actAsUser(const ReportStep &step)
-    {
-        UReportView *view = visibleView(step.a);
-        if (view == nullptr) {
-            return;
-        }
-        const bool isStale = std::any_of(views_.begin(), views_.end(), [](const Shown &one) { return one.isStale; });
-        if (isStale) {
-            tellViews(); // what is typed into another text than the report's takes the place of that
-        }
-        if (view->GetEdit().isLoading()) {
-            QTest::keyClick(&view->GetEdit(), step.c % 2 == 0 ? Qt::Key_X : Qt::Key_Delete); // which edits nothing
-        } else {
-            actInView(*view, step);
-        }
-    }
+    void actAsUser(const ReportStep &step);
 
     /// A place in a text, all over it also where that is long.
-    static int placeIn(int length, int number)
-    {
-        constexpr int range = 5000;
-        return length <= range ? number % length : static_cast<int>(qint64(number) * (length - 1) / range);
-    }
+    static int placeIn(int length, int number);
 
-    void actInView(UReportView &view, const ReportStep &step)
-    {
-        kareport::ReportEdit &edit = view.GetEdit();
-        const int length = edit.document()->characterCount();
-        const int place = placeIn(length, step.b);
-        const int other = std::min(length - 1, place + step.c % (step.c % 3 == 0 ? 200 : 12));
-        EditSpy spy(edit);
-        switch (step.op) {
-        case ReportOp::Type:
-            putCursor(edit, place);
-            QTest::keyClick(&edit, step.c % 2 == 0 ? Qt::Key_X : Qt::Key_Space);
-            break;
-        case ReportOp::LineEnd:
-            putCursor(edit, place);
-            QTest::keyClick(&edit, Qt::Key_Return);
-            break;
-        case ReportOp::Backspace:
-            putCursor(edit, place);
-            QTest::keyClick(&edit, Qt::Key_Backspace);
-            break;
-        case ReportOp::Delete:
-            putCursor(edit, place);
-            QTest::keyClick(&edit, Qt::Key_Delete);
-            break;
-        case ReportOp::Cut:
-            putWholeLines(edit, place, other, step.c % 2 == 0);
-            clip_ = edit.textCursor().selectedText().replace(QChar::ParagraphSeparator, u'\n');
-            edit.textCursor().removeSelectedText();
-            break;
-        case ReportOp::Paste:
-            putWholeLines(edit, place, place, step.c % 2 == 0);
-            edit.textCursor().insertText(clip_);
-            break;
-        case ReportOp::TypeOver:
-            putWholeLines(edit, place, other, step.c % 2 == 0);
-            QTest::keyClick(&edit, Qt::Key_Y);
-            break;
-        case ReportOp::Undo: edit.undo(); break;
-        case ReportOp::Redo: edit.redo(); break;
-        case ReportOp::TakeAll:
-            view.OnChange();
-            model_.withCrLf();
-            isModified_ = true;
-            break;
-        default: break;
-        }
-        editsSeen_ = spy.edits.size();
-        for (const SeenEdit &seen : spy.edits) {
-            if (!isAllCrLf()) {
-                model_.withCrLf();
-            }
-            model_.replace(seen.at, seen.removed, seen.inserted);
-            isModified_ = true;
-        }
-    }
+    void actInView(UReportView &view, const ReportStep &step);
 
-    static void putWholeLines(kareport::ReportEdit &edit, int from, int to, bool isWhole)
-    {
-        QTextCursor cursor(edit.document());
-        cursor.setPosition(from);
-        if (isWhole) {
-            cursor.movePosition(QTextCursor::StartOfBlock);
-        }
-        const int start = cursor.position();
-        cursor.setPosition(std::max(start, to));
-        if (isWhole) {
-            cursor.movePosition(QTextCursor::StartOfBlock);
-        }
-        putCursor(edit, cursor.position(), start);
-    }
+    static void putWholeLines(kareport::ReportEdit &edit, int from, int to, bool isWhole);
 
-    QString compareReport(const QString &text)
-    {
-        if (wrongAnswer_) {
-            return QStringLiteral("an operation answered wrong");
-        }
-        if (report().CopyText() != text) {
-            return QStringLiteral("the text is \"%1\" and not \"%2\"").arg(brief(report().CopyText()), brief(text));
-        }
-        if (report().GetPageStarts() != model_.starts()) {
-            return QStringLiteral("pages start at %1 and not at %2")
-                .arg(brief(joined(report().GetPageStarts())), brief(joined(model_.starts())));
-        }
-        if (report().IsModified() != isModified_) {
-            return QStringLiteral("modified is %1").arg(report().IsModified());
-        }
-        return QString();
-    }
+    QString compareReport(const QString &text);
 
-    QString compareViews(const QString &text)
-    {
-        const std::vector<kareport::ReportPage> pages = model_.pages();
-        if (shown(report().GetPages()) != shown(pages)) {
-            return QStringLiteral("pages are %1 and not %2")
-                .arg(brief(shown(report().GetPages())), brief(shown(pages)));
-        }
-        for (std::size_t i = 0; i < views_.size(); ++i) {
-            const Shown &one = views_[i];
-            if (one.isStale) {
-                continue;
-            }
-            QString wrong = wrongWithText(*one.view, text);
-            if (wrong.isEmpty() && !one.view->GetEdit().isLoading()) {
-                wrong = wrongWithPages(*one.view, text, pages);
-            }
-            if (!wrong.isEmpty()) {
-                return QStringLiteral("view %1: ").arg(i) + wrong;
-            }
-        }
-        return QString();
-    }
+    QString compareViews(const QString &text);
 
     ShownReport shown_;
     ReportModel model_;

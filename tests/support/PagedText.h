@@ -18,21 +18,7 @@
 class PagedText
 {
 public:
-    explicit PagedText(const QString &text = QString()) : document_(new QTextDocument)
-    {
-        document_->setDocumentLayout(new QPlainTextDocumentLayout(document_.get()));
-        QFont font;
-        font.setFamilies({QStringLiteral("DejaVu Sans Mono")});
-        font.setFixedPitch(true);
-        font.setPointSize(8);
-        document_->setDefaultFont(font);
-        document_->setPlainText(text);
-        printer_.setOutputFormat(QPrinter::PdfFormat);
-        printer_.setOutputFileName(file());
-        printer_.setResolution(600);
-        printer_.setPageSize(QPageSize(QPageSize::A4));
-        printer_.setFullPage(true);
-    }
+    explicit PagedText(const QString &text = QString());
 
     QTextDocument &document() { return *document_; }
     QPrinter &printer() { return printer_; }
@@ -40,23 +26,9 @@ public:
     kareport::LinePager pager() { return {*document_, printer_}; }
 
     /// A rectangle that takes so many lines and characters, at the place of the usual margins.
-    static QRect room(int lines, int characters)
-    {
-        return {567, 567, (characters * 40 + 5) * 1440 / 600, (lines * 78 + 5) * 1440 / 600};
-    }
+    static QRect room(int lines, int characters);
     /// Where the pages of the text begin.
-    std::vector<qint64> starts(const QRect &page)
-    {
-        std::vector<qint64> found = {0};
-        kareport::LinePager pages = pager();
-        for (;;) {
-            const qint64 next = pages.layOut(page, found.back(), -1);
-            if (next >= pages.length() || next <= found.back()) {
-                return found;
-            }
-            found.push_back(next);
-        }
-    }
+    std::vector<qint64> starts(const QRect &page);
 
 private:
     QTemporaryDir folder_;
@@ -65,7 +37,4 @@ private:
 };
 
 /// Lines of four characters and their end.
-inline QString shortLines(int count)
-{
-    return QStringLiteral("line\n").repeated(count);
-}
+QString shortLines(int count);

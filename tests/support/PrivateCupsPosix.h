@@ -14,75 +14,26 @@
 class PrivateCups
 {
 public:
-    PrivateCups()
-    {
-        // The socket's path must be short, whatever folder tests are given for temporary files.
-        process_.start(
-            QStringLiteral(KAREPORT_SCRIPTS_DIR "/private-cups.sh"),
-            {folder_.path(), QStringLiteral("sh"), QStringLiteral("-c"), QStringLiteral("echo ready; read -r line")});
-        while (process_.state() != QProcess::NotRunning && !process_.canReadLine()) {
-            if (!process_.waitForReadyRead(10'000)) {
-                break;
-            }
-        }
-        running_ = process_.canReadLine() && process_.readLine() == "ready\n";
-        if (running_) {
-            const QByteArray socket = QFile::encodeName(folder_.filePath(QStringLiteral("state/cups.sock")));
-            before_ = qgetenv("CUPS_SERVER");
-            qputenv("CUPS_SERVER", socket);
-            useServerOfEnvironment();
-        }
-    }
-    ~PrivateCups()
-    {
-        end();
-        if (running_) {
-            before_.isNull() ? qunsetenv("CUPS_SERVER") : qputenv("CUPS_SERVER", before_);
-            useServerOfEnvironment();
-        }
-    }
+    PrivateCups();
+    ~PrivateCups();
     PrivateCups(const PrivateCups &) = delete;
     PrivateCups &operator=(const PrivateCups &) = delete;
 
     bool isRunning() const { return running_; }
     /// Why there is none.
     std::string reason() { return process_.readAllStandardError().toStdString(); }
-    void end()
-    {
-        process_.closeWriteChannel();
-        process_.waitForFinished(10'000);
-    }
+    void end();
 
     /// The pages of the job that arrives, after a wait; -1 when none does.
-    int arrivedPages()
-    {
-        QElapsedTimer timer;
-        timer.start();
-        while (timer.elapsed() < 30'000 && jobs() != 0) {
-            QThread::msleep(50);
-        }
-        return pagesIn(arrived());
-    }
+    int arrivedPages();
     /// The last job that has arrived.
     QString arrived() const { return folder_.filePath(QStringLiteral("arrived/job.pdf")); }
     /// The jobs that wait or are printed.
-    int jobs()
-    {
-        QProcess lpstat;
-        lpstat.start(QStringLiteral("lpstat"), {QStringLiteral("-o")});
-        lpstat.waitForFinished();
-        return static_cast<int>(lpstat.readAllStandardOutput().count('\n'));
-    }
+    int jobs();
 
 private:
     /// The library of the print system asks for the server once.
-    static void useServerOfEnvironment()
-    {
-        QLibrary library(QStringLiteral("cups"), 2);
-        if (auto *setServer = reinterpret_cast<void (*)(const char *)>(library.resolve("cupsSetServer"))) {
-            setServer(nullptr);
-        }
-    }
+    static void useServerOfEnvironment();
 
     QTemporaryDir folder_{QStringLiteral("/tmp/ka-cups-XXXXXX")};
     QProcess process_;

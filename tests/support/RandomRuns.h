@@ -12,33 +12,13 @@
 class RandomRuns
 {
 public:
-    RandomRuns(const char *what, quint64 firstSeed, int runs) : what_(what), runs_(runs)
-    {
-        const quint64 given = qEnvironmentVariable("KAREPORT_RANDOM_SEED").toULongLong();
-        seed_ = given != 0 ? given : firstSeed;
-        seconds_ = qEnvironmentVariableIntValue("KAREPORT_RANDOM_SECONDS");
-        std::printf("%s: first seed %llu\n", what_, static_cast<unsigned long long>(seed_));
-        std::fflush(stdout);
-        --seed_;
-        timer_.start();
-    }
-    ~RandomRuns()
-    {
-        std::printf("%s: %d runs, last seed %llu\n", what_, done_, static_cast<unsigned long long>(seed_));
-    }
+    RandomRuns(const char *what, quint64 firstSeed, int runs);
+    ~RandomRuns();
     RandomRuns(const RandomRuns &) = delete;
     RandomRuns &operator=(const RandomRuns &) = delete;
 
     /// Goes on to the next run. @return whether there is one
-    bool next()
-    {
-        if (seconds_ > 0 ? timer_.elapsed() >= seconds_ * 1000LL : done_ >= runs_) {
-            return false;
-        }
-        ++seed_;
-        ++done_;
-        return true;
-    }
+    bool next();
     /// The seed of this run: as the first seed it brings the run about again.
     quint64 seed() const { return seed_; }
 

@@ -12,11 +12,7 @@
 class ShownPane : public CViewPane
 {
 public:
-    void ShowPane(bool show) override
-    {
-        (show ? shows : hides)++;
-        CViewPane::ShowPane(show);
-    }
+    void ShowPane(bool show) override;
     void BringToTop() override { ++tops; }
 
     int shows = 0;
@@ -37,30 +33,13 @@ public:
 class ReportEditor : public testing::Test
 {
 protected:
-    ReportEditor()
-    {
-        reports_ = application_.AddDocTemplate(std::make_unique<UDocTemplate>(
-            1, [this] { return std::make_unique<UReportDoc>(QString(), false, closesConverted, nullptr); },
-            [] { return new ShownPane; }, [] { return std::make_unique<TestReportView>(); },
-            QStringLiteral("REPORTDOCTEMPLATE"), 1, 1));
-    }
+    ReportEditor();
 
-    UReportDoc *create(const QString &name = QString(), bool externalEditor = true)
-    {
-        return CreateReport(name, false, externalEditor, nullptr, 0, nullptr);
-    }
+    UReportDoc *create(const QString &name = QString(), bool externalEditor = true);
     /// A report with a line.
-    UReportDoc *createWritten(const QString &name = QString())
-    {
-        UReportDoc *report = create(name);
-        report->WriteLine(QStringLiteral("text"), 0, 1, 0);
-        return report;
-    }
+    UReportDoc *createWritten(const QString &name = QString());
     static ShownPane *paneOf(const UReportDoc *report) { return static_cast<ShownPane *>(report->GetFrameWindow()); }
-    static TestReportView *viewOf(const UReportDoc *report)
-    {
-        return static_cast<TestReportView *>(report->GetViews().at(0));
-    }
+    static TestReportView *viewOf(const UReportDoc *report);
     /// Hides the application with its template for reports, as long as what comes back lives.
     static std::unique_ptr<UApplication> hideTemplate() { return std::make_unique<UApplication>(); }
     std::vector<UDocument *> documents() const { return reports_->GetDocuments(); }
@@ -81,12 +60,4 @@ private:
 };
 
 /// A report's lines, each in a paragraph template of its own, as the file for a word processor holds them.
-inline std::string richTextOf(const std::vector<std::string> &lines)
-{
-    std::string text =
-        "{\\rtf1\\ansi\\ansicpg1252\\deff0\\deflang1033{\\fonttbl{\\f8\\fnil\\fcharset0 Lucida Console;}}";
-    for (const std::string &line : lines) {
-        text += "\\viewkind4\\uc1\\pard\\f1\\fs18 " + line + " \\par";
-    }
-    return text + "}";
-}
+std::string richTextOf(const std::vector<std::string> &lines);

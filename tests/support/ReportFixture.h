@@ -27,64 +27,25 @@
 class FixedSurroundings
 {
 public:
-    FixedSurroundings()
-    {
-        if (++count_ == 1) {
-            fix();
-        }
-    }
-    ~FixedSurroundings()
-    {
-        if (--count_ > 0) {
-            return;
-        }
-        // The flag is one for all reports and outlives the preferences that it was read from.
-        WriteProfileString(QString(), QStringLiteral("ReportPrintHash"), QStringLiteral("0"));
-        {
-            const UReportDoc resetsPrintHash;
-        }
-        kareport::setProfileStore(kareport::makeMemoryProfile());
-        kareport::fixTime(std::nullopt);
-        kareport::setDefaultPrinter({});
-        kareport::setLibraryDir(QString());
-        kareport::setStartPathName(QString());
-        kareport::setMessageHandler({});
-        SetApplicationTitle(QStringLiteral("TALVEN"));
-        UPreviewDlg::SetModulePrinterOrientationPortrait(true);
-    }
+    FixedSurroundings();
+    ~FixedSurroundings();
     FixedSurroundings(const FixedSurroundings &) = delete;
     FixedSurroundings &operator=(const FixedSurroundings &) = delete;
 
 private:
-    static void fix()
-    {
-        kareport::setProfileStore(kareport::makeMemoryProfile());
-        kareport::fixTime(QDateTime(QDate(2024, 3, 5), QTime(14, 7)));
-        kareport::setDefaultPrinter({kareport::PrinterSource::BuiltIn, kareport::PaperSize::A4, 600});
-    }
+    static void fix();
 
     static inline int count_ = 0;
 };
 
 /// A text whose lines end with LF, as a report ends them.
-inline QString reportLines(QString text)
-{
-    return text.replace(u'\n', QStringLiteral("\r\n"));
-}
+QString reportLines(QString text);
 
-inline QString textOf(const UReportDoc &report)
-{
-    return report.GetText().toString();
-}
+QString textOf(const UReportDoc &report);
 
 /// The page header that a report of the fixed surroundings begins a page with, without line ends. For 80 characters a
 /// row and titles of up to 30.
-inline QString headerOf(const QString &title, int page)
-{
-    const QString front = QStringLiteral("TALVEN - ") + title;
-    return front + u' ' + QStringLiteral("Mar 05, 2024  02:07PM").rightJustified(80 - front.size() - 20) +
-           QStringLiteral("    Page:") + QString::number(page).rightJustified(3);
-}
+QString headerOf(const QString &title, int page);
 
 /// A pane that counts how often it is asked to show its title again.
 class CountingPane : public CViewPane
@@ -111,19 +72,8 @@ public:
 class ReportApplication : public UApplication
 {
 public:
-    ReportApplication()
-        : reportTemplate_(AddDocTemplate(kareport::makeReportTemplate(
-              [] { return new CountingPane; }, [] { return std::make_unique<TestReportView>(); })))
-    {}
-    ~ReportApplication() override
-    {
-        while (!reportTemplate_->GetDocuments().empty()) {
-            auto *report = static_cast<UReportDoc *>(reportTemplate_->GetDocuments().back());
-            report->SetAutoDelete(true);
-            report->SetCloseDocument(2);
-            report->OnCloseDocument();
-        }
-    }
+    ReportApplication();
+    ~ReportApplication() override;
 
     UDocTemplate *reportTemplate() const { return reportTemplate_; }
     /// A report with a pane of its own.
@@ -137,24 +87,12 @@ private:
 class TestReportWindow : public kareport::ReportWindow
 {
 public:
-    explicit TestReportWindow(CViewPane *pane = nullptr, bool *destroyed = nullptr) : pane_(pane), destroyed_(destroyed)
-    {}
-    ~TestReportWindow() override
-    {
-        if (destroyed_ != nullptr) {
-            *destroyed_ = true;
-        }
-    }
+    explicit TestReportWindow(CViewPane *pane = nullptr, bool *destroyed = nullptr);
+    ~TestReportWindow() override;
     void WriteLine(const QString &piece) override { pieces += piece; }
     CViewPane *GetOwningPane() override { return pane_; }
     bool isCreated() const override { return created; }
-    bool createDocked(const QString &caption, UView *previousView) override
-    {
-        calls += QStringLiteral("create ") + caption;
-        previous = previousView;
-        created = canBeCreated;
-        return created;
-    }
+    bool createDocked(const QString &caption, UView *previousView) override;
     void showBar(bool show) override { calls += show ? QStringLiteral("show") : QStringLiteral("hide"); }
     void setActive(bool active) override { calls += active ? QStringLiteral("active") : QStringLiteral("not active"); }
     void takeFocus() override { calls += QStringLiteral("focus"); }

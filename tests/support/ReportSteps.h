@@ -65,12 +65,4 @@ struct ReportStep
 };
 
 /// A step as a row of a test.
-inline QString textOf(const ReportStep &step)
-{
-    return QStringLiteral("    {ReportOp::%1, %2, %3, %4, %5},\n")
-        .arg(QLatin1StringView(reportOpNames[int(step.op)]))
-        .arg(step.a)
-        .arg(step.b)
-        .arg(step.c)
-        .arg(step.report);
-}
+QString textOf(const ReportStep &step);

@@ -30,51 +30,17 @@
 class WindowDesk
 {
 public:
-    WindowDesk()
-    {
-        application.emplace();
-        application->AddDocTemplate(ReportInitialTemplate());
-        frame.emplace();
-        frame->resize(800, 600);
-        frame->show();
-        QApplication::setActiveWindow(&*frame);
-    }
-    ~WindowDesk()
-    {
-        application.reset();
-        frame.reset();
-        settle();
-    }
+    WindowDesk();
+    ~WindowDesk();
     WindowDesk(const WindowDesk &) = delete;
     WindowDesk &operator=(const WindowDesk &) = delete;
 
     /// Lets everything happen that waits, deferred deletions as well.
-    static void settle()
-    {
-        QCoreApplication::processEvents();
-        QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
-        QCoreApplication::processEvents();
-    }
+    static void settle();
     /// A report in a pane of its own, whose view is the active one.
-    UReportDoc *openReport(const QString &name) const
-    {
-        UReportDoc *report = CreateReport(name, false, false, nullptr, 0, nullptr);
-        UXTPMDIFrameWnd::Get()->SetActiveViewForFrameAndPane(report->GetViews().front());
-        settle();
-        return report;
-    }
-    static UReportWindowDlg &windowOf(const UReportDoc *report)
-    {
-        return *dynamic_cast<UReportWindowDlg *>(report->GetReportWindow());
-    }
-    static QStringList rowsOf(const UReportWindowDlg &window)
-    {
-        QStringList rows;
-        for (int row = 0; window.GetList() != nullptr && row < window.GetList()->GetCount(); ++row) {
-            rows += window.GetList()->GetText(row);
-        }
-        return rows;
-    }
+    UReportDoc *openReport(const QString &name) const;
+    static UReportWindowDlg &windowOf(const UReportDoc *report);
+    static QStringList rowsOf(const UReportWindowDlg &window);
 
 private:
     FixedSurroundings surroundings_;
@@ -88,16 +54,7 @@ public:
 class AnsweredSaving
 {
 public:
-    explicit AnsweredSaving(std::optional<QString> path)
-    {
-        kareport::setSaveDialog([this, path](const kareport::SaveRequest &request) {
-            requests.push_back(request);
-            if (meanwhile) {
-                meanwhile();
-            }
-            return path;
-        });
-    }
+    explicit AnsweredSaving(std::optional<QString> path);
     ~AnsweredSaving() { kareport::setSaveDialog({}); }
     AnsweredSaving(const AnsweredSaving &) = delete;
     AnsweredSaving &operator=(const AnsweredSaving &) = delete;
@@ -110,16 +67,7 @@ public:
 class AnsweredBoxes
 {
 public:
-    explicit AnsweredBoxes(MessageAnswer answer)
-    {
-        kareport::setMessageBox([this, answer](const kareport::Message &message) {
-            boxes.push_back(message);
-            if (meanwhile) {
-                meanwhile();
-            }
-            return answer;
-        });
-    }
+    explicit AnsweredBoxes(MessageAnswer answer);
     ~AnsweredBoxes() { kareport::setMessageBox({}); }
     AnsweredBoxes(const AnsweredBoxes &) = delete;
     AnsweredBoxes &operator=(const AnsweredBoxes &) = delete;
@@ -132,12 +80,7 @@ public:
 class OwnReportWindow : public testing::Test
 {
 protected:
-    bool create(const QString &title = QStringLiteral("Traverse"), UView *previous = nullptr)
-    {
-        const bool created = window.createDocked(title, previous);
-        WindowDesk::settle();
-        return created;
-    }
+    bool create(const QString &title = QStringLiteral("Traverse"), UView *previous = nullptr);
     QStringList rows() const { return WindowDesk::rowsOf(window); }
 
     WindowDesk desk;
@@ -148,35 +91,10 @@ protected:
 class WrittenReportWindow : public testing::Test
 {
 protected:
-    WrittenReportWindow()
-        : before(desk.openReport(QStringLiteral("Survey"))),
-          report(CreateReportWindow(QStringLiteral("Traverse"), false, false)),
-          window(WindowDesk::windowOf(report))
-    {
-        report->WriteLine(QStringLiteral("  first"), 0, 1, 0);
-        report->WriteLine(QStringLiteral("second"), 0, 1, 0);
-        WindowDesk::settle();
-    }
+    WrittenReportWindow();
 
-    bool isEnabled(unsigned command) const
-    {
-        window.GetToolBar()->OnUpdateCmdUI(nullptr, true);
-        for (const QAction *button : window.GetToolBar()->actions()) {
-            if (button->data().toUInt() == command) {
-                return button->isEnabled();
-            }
-        }
-        return false;
-    }
-    void click(unsigned command) const
-    {
-        for (QAction *button : window.GetToolBar()->actions()) {
-            if (button->data().toUInt() == command) {
-                QTest::mouseClick(window.GetToolBar()->widgetForAction(button), Qt::LeftButton);
-                return;
-            }
-        }
-    }
+    bool isEnabled(unsigned command) const;
+    void click(unsigned command) const;
     UView *activeView() const { return desk.frame->GetActiveView(); }
     std::size_t reports() const { return GetReportTemplate()->GetDocuments().size(); }
 

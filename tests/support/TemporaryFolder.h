@@ -9,39 +9,17 @@
 class TemporaryFolder
 {
 public:
-    explicit TemporaryFolder(const QString &suffix = QString())
-        : unix_(qgetenv("TMPDIR")),
-          windows_(qgetenv("TMP")),
-          isUnixSet_(qEnvironmentVariableIsSet("TMPDIR")),
-          isWindowsSet_(qEnvironmentVariableIsSet("TMP"))
-    {
-        set(folder_.path() + suffix);
-    }
-    ~TemporaryFolder()
-    {
-        restore("TMPDIR", unix_, isUnixSet_);
-        restore("TMP", windows_, isWindowsSet_);
-    }
+    explicit TemporaryFolder(const QString &suffix = QString());
+    ~TemporaryFolder();
     TemporaryFolder(const TemporaryFolder &) = delete;
     TemporaryFolder &operator=(const TemporaryFolder &) = delete;
 
-    static void set(const QString &path)
-    {
-        qputenv("TMPDIR", path.toLocal8Bit());
-        qputenv("TMP", path.toLocal8Bit());
-    }
+    static void set(const QString &path);
     /// The path of a file in the folder.
     QString at(const QString &name) const { return folder_.path() + QDir::separator() + name; }
 
 private:
-    static void restore(const char *name, const QByteArray &value, bool isSet)
-    {
-        if (isSet) {
-            qputenv(name, value);
-        } else {
-            qunsetenv(name);
-        }
-    }
+    static void restore(const char *name, const QByteArray &value, bool isSet);
 
     QTemporaryDir folder_;
     QByteArray unix_;

@@ -1,0 +1,44 @@
+#include "DeskFixture.h"
+
+Desk::Desk()
+{
+    QStandardPaths::setTestModeEnabled(true);
+    kareport::setProfileStore(kareport::makeMemoryProfile());
+    kareport::setMessageBox([this](const kareport::Message &message) {
+        messages.append(message.text);
+        return answer;
+    });
+    application.emplace();
+    frame.emplace();
+    frame->show();
+}
+
+Desk::~Desk()
+{
+    frame.reset();
+    application.reset();
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    kareport::setMessageBox({});
+    kareport::setProfileStore(kareport::makeMemoryProfile());
+}
+
+std::vector<UReportDoc *> Desk::reports()
+{
+    std::vector<UReportDoc *> found;
+    for (UDocument *document : GetReportTemplate()->GetDocuments()) {
+        found.push_back(dynamic_cast<UReportDoc *>(document));
+    }
+    return found;
+}
+
+QString Desk::textOf(const UReportDoc &report)
+{
+    return report.CopyText().replace(QStringLiteral("\r\n"), QStringLiteral("\n"));
+}
+
+QByteArray lineJob(const char *line)
+{
+    return R"({"title": "Lines", "header": false, "page": {"linesPerPage": 60, "charsPerRow": 80},
+               "report": [{"line": ")" +
+           QByteArray(line) + R"("}]})";
+}

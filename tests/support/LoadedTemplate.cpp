@@ -1,0 +1,7 @@
+#include "LoadedTemplate.h"
+
+LoadedTemplate::LoadedTemplate(const QByteArray &content, const QString &name)
+{
+    const TemplateOnDisk file(content);
+    loaded = file.written() && tpl.LoadTemplate(file.path(), name);
+}

@@ -1,0 +1,155 @@
+#include "PdfReadBack.h"
+
+#include <QFile>
+#include <QProcess>
+#include <QRegularExpression>
+
+#include <algorithm>
+
+PdfReadBack::PdfReadBack(const QByteArray &bytes, const char *remark)
+    : path_(folder_.filePath(QStringLiteral("a.pdf"))), remark_(remark)
+{
+    QFile file(path_);
+    EXPECT_TRUE(file.open(QIODevice::WriteOnly));
+    EXPECT_EQ(file.write(bytes), bytes.size());
+}
+
+QStringList PdfReadBack::columns(double pointsPerCharacter) const
+{
+    QStringList texts = textOfPages({QStringLiteral("-fixed"), QString::number(pointsPerCharacter)});
+    for (QString &text : texts) {
+        QStringList lines = text.split(u'\n');
+        qsizetype margin = text.size();
+        for (const QString &line : lines) {
+            const auto ink = std::find_if(line.begin(), line.end(), [](QChar c) { return c != u' '; });
+            margin = ink != line.end() ? std::min<qsizetype>(margin, ink - line.begin()) : margin;
+        }
+        for (QString &line : lines) {
+            line.remove(0, margin);
+        }
+        text = lines.join(u'\n');
+    }
+    return texts;
+}
+
+QString PdfReadBack::characters() const
+{
+    QString text = QString::fromUtf8(run("pdftotext", {QStringLiteral("-raw"), path_, QStringLiteral("-")}));
+    return text.remove(QRegularExpression(QStringLiteral("[ \n\f]")));
+}
+
+std::vector<PdfFont> PdfReadBack::fonts() const
+{
+    // The columns after the name: type, encoding, emb, sub, uni, object.
+    static const QRegularExpression row(
+        QStringLiteral("^(\\S+) +(\\S.*?) +(\\S+) +(yes|no) +(yes|no) +(yes|no) +\\d+ +\\d+$"));
+    std::vector<PdfFont> fonts;
+    for (const QString &line : QString::fromUtf8(run("pdffonts", {path_})).split(u'\n').mid(2)) {
+        if (const auto match = row.match(line.trimmed()); match.hasMatch()) {
+            const auto isYes = [&match](int column) { return match.captured(column) == u"yes"; };
+            fonts.push_back({match.captured(1), match.captured(2), isYes(4), isYes(5), isYes(6)});
+        } else {
+            EXPECT_TRUE(line.isEmpty()) << line.toStdString();
+        }
+    }
+    return fonts;
+}
+
+std::vector<PdfWord> PdfReadBack::words(int page) const
+{
+    static const QRegularExpression word(
+        QStringLiteral("<word xMin=\"(.*?)\" yMin=\"(.*?)\" xMax=\"(.*?)\" yMax=\"(.*?)\">(.*?)</word>"));
+    const QString number = QString::number(page);
+    const QString text =
+        QString::fromUtf8(run("pdftotext", {QStringLiteral("-bbox"), QStringLiteral("-f"), number, QStringLiteral("-l"),
+                                            number, path_, QStringLiteral("-")}));
+    std::vector<PdfWord> words;
+    for (auto match = word.globalMatch(text); match.hasNext();) {
+        const auto found = match.next();
+        words.push_back({found.captured(5), found.captured(1).toDouble(), found.captured(2).toDouble(),
+                         found.captured(3).toDouble(), found.captured(4).toDouble()});
+    }
+    return words;
+}
+
+QString PdfReadBack::check() const
+{
+    QProcess process;
+    process.setProcessChannelMode(QProcess::MergedChannels);
+    process.start(QStringLiteral("qpdf"), {QStringLiteral("--check"), path_}, QIODevice::ReadOnly);
+    const bool ended = process.waitForFinished(60'000);
+    const QString said = QString::fromUtf8(process.readAll());
+    return ended && process.exitStatus() == QProcess::NormalExit && process.exitCode() == 0
+               ? QString()
+               : QStringLiteral("qpdf: ") + said;
+}
+
+QByteArray PdfReadBack::objects() const
+{
+    return run("qpdf",
+               {QStringLiteral("--qdf"), QStringLiteral("--object-streams=disable"), path_, QStringLiteral("-")});
+}
+
+QImage PdfReadBack::picture(int page, int dotsPerInch) const
+{
+    const QString number = QString::number(page);
+    const QString stem = folder_.filePath(QStringLiteral("page"));
+    run("pdftoppm", {QStringLiteral("-r"), QString::number(dotsPerInch), QStringLiteral("-gray"),
+                     QStringLiteral("-png"), QStringLiteral("-singlefile"), QStringLiteral("-f"), number, path_, stem});
+    const QImage image(stem + QStringLiteral(".png"));
+    EXPECT_FALSE(image.isNull());
+    return image.convertToFormat(QImage::Format_Grayscale8);
+}
+
+QStringList PdfReadBack::textOfPages(const QStringList &options) const
+{
+    QStringList texts =
+        QString::fromUtf8(run("pdftotext", options + QStringList{path_, QStringLiteral("-")})).split(u'\f');
+    texts.removeLast(); // every page ends with a form feed
+    for (QString &text : texts) {
+        while (text.endsWith(u'\n')) {
+            text.chop(1);
+        }
+    }
+    return texts;
+}
+
+QByteArray PdfReadBack::run(const char *program, const QStringList &arguments) const
+{
+    QProcess process;
+    process.start(QString::fromUtf8(program), arguments, QIODevice::ReadOnly);
+    const bool ended = process.waitForFinished(60'000);
+    EXPECT_TRUE(ended && process.exitStatus() == QProcess::NormalExit && process.exitCode() == 0)
+        << program << ": " << process.readAllStandardError().toStdString();
+    QByteArray said = process.readAllStandardError();
+    said.replace(remark_, "");
+    EXPECT_EQ(said.toStdString(), "") << program;
+    return process.readAllStandardOutput();
+}
+
+QString PdfReadBack::info(const char *entry) const
+{
+    const QString name = QString::fromUtf8(entry) + u':';
+    for (const QString &line : QString::fromUtf8(run("pdfinfo", {path_})).split(u'\n')) {
+        if (line.startsWith(name)) {
+            return line.mid(name.size()).trimmed();
+        }
+    }
+    return {};
+}
+
+Ink inkIn(const QImage &image, const QRect &area)
+{
+    Ink ink;
+    const QRect part = area.intersected(image.rect());
+    for (int y = part.top(); y <= part.bottom(); ++y) {
+        for (int x = part.left(); x <= part.right(); ++x) {
+            const int darkness = 255 - qGray(image.pixel(x, y));
+            ink.amount += darkness / 255.0;
+            if (darkness > 40) {
+                ink.box |= QRect(x, y, 1, 1);
+            }
+        }
+    }
+    return ink;
+}
