@@ -12,7 +12,7 @@ namespace
 {
 
 /// A piece takes about so long: the window answers well before a user notices, and what stands around a piece costs little.
-constexpr qint64 pieceTime = 25;       // milliseconds
+constexpr qint64 pieceTime = 15;       // milliseconds
 constexpr qint64 firstPiece = 100'000; // characters: more than any window shows
 constexpr qint64 shortestPiece = 20'000;
 constexpr qint64 longestPiece = 4'000'000;

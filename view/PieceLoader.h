@@ -29,6 +29,8 @@ public:
     PieceLoader(QTextDocument &document, PiecedText text, std::function<void()> due);
 
     bool isDone() const { return at_ >= text_.length; }
+    /// Whether the next piece may be the last one.
+    bool isLastPiece() const { return text_.length - at_ <= pieceLength_; }
     /// Whether the text has ended before its length.
     bool isCutShort() const { return isCutShort_; }
     int percent() const;

@@ -6,6 +6,7 @@
 #include <QMimeData>
 #include <QPlainTextDocumentLayout>
 #include <QScrollBar>
+#include <QSignalBlocker>
 #include <QTextBlock>
 #include <QTextDocument>
 #include <QTextLayout>
@@ -107,6 +108,7 @@ void ReportEdit::loadPlainTextInPieces(PiecedText text, std::function<void(bool 
     }
     waiting_ = textCursor().position();
     isScrolled_ = false;
+    sinceShown_.start();
     setReadOnly(true);
     if (loader_->isDone()) {
         endLoading();
@@ -120,7 +122,17 @@ void ReportEdit::loadPiece()
     // A cursor at the end of what has been loaded would go along with what is added there.
     const int position = textCursor().position();
     const int anchor = textCursor().anchor();
-    loader_->addPiece();
+    {
+        // Every piece would paint the whole window and move the scroll bar: a few times a second is enough.
+        constexpr qint64 showInterval = 200; // milliseconds
+        const bool isShown = sinceShown_.elapsed() >= showInterval;
+        QSignalBlocker blocker(document()->documentLayout());
+        if (isShown || loader_->isLastPiece()) {
+            blocker.unblock();
+            sinceShown_.start();
+        }
+        loader_->addPiece();
+    }
     if (textCursor().position() != position || textCursor().anchor() != anchor) {
         QTextCursor cursor(document());
         cursor.setPosition(anchor);

@@ -5,6 +5,7 @@
 #include "ReportChange.h"
 #include "RichTextReader.h"
 
+#include <QElapsedTimer>
 #include <QImage>
 #include <QPlainTextEdit>
 #include <QString>
@@ -119,6 +120,7 @@ private:
     Place wanted_ = {};                ///< where the window stood before, which may not have been loaded yet
     int waiting_ = 0;                  ///< the cursor's position until then
     bool isScrolled_ = false;          ///< by the user, since loading began
+    QElapsedTimer sinceShown_;         ///< since the window was last told of a piece
     bool isFollowing_ = false;
     int length_ = 0;
     int lineEnds_ = 0;

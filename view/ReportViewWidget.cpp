@@ -96,7 +96,11 @@ ReportViewWidget::ReportViewWidget(QWidget *parent)
     placeTimer_.setInterval(0);
     connect(&placeTimer_, &QTimer::timeout, this, [this] { showPlace(); });
     connect(edit_, &QPlainTextEdit::cursorPositionChanged, &placeTimer_, qOverload<>(&QTimer::start));
-    connect(edit_, &QPlainTextEdit::blockCountChanged, &placeTimer_, qOverload<>(&QTimer::start));
+    connect(edit_, &QPlainTextEdit::blockCountChanged, &placeTimer_, [this] {
+        if (!edit_->isLoading()) { // `showLoading` follows that
+            placeTimer_.start();
+        }
+    });
     for (QWidget *child : findChildren<QWidget *>()) {
         child->installEventFilter(this); // wherever the mouse is pressed
     }
@@ -187,8 +191,12 @@ void ReportViewWidget::showPlace()
 
 void ReportViewWidget::showLoading()
 {
-    showIn(*loadLabel_,
-           edit_->isLoading() ? Xlate("Loading %1 %@@percent of a report").arg(edit_->loadedPercent()) : QString());
+    const QString text =
+        edit_->isLoading() ? Xlate("Loading %1 %@@percent of a report").arg(edit_->loadedPercent()) : QString();
+    if (text != loadLabel_->text() || !edit_->isLoading()) { // there are more pieces than percents
+        showIn(*loadLabel_, text);
+        placeTimer_.start();
+    }
 }
 
 void ReportViewWidget::showZoom()

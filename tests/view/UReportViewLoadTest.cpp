@@ -3,6 +3,7 @@
 #include "FindBar.h"
 
 #include <QClipboard>
+#include <QElapsedTimer>
 #include <QLabel>
 #include <QLineEdit>
 #include <QScrollBar>
@@ -58,6 +59,28 @@ TEST(UReportViewLoad, ShowsTheBeginningAtOnceAndTheRestFromTheEventLoop)
     EXPECT_EQ(report.edit().windowText(), longText());
     EXPECT_FALSE(report.shown.report.IsModified());
     EXPECT_EQ(widgetOf(*report.view).loadLabel().text(), QString());
+}
+
+TEST(UReportViewLoad, TheWindowFollowsAFewTimesASecondAndAtTheEnd)
+{
+    LongReport report;
+    int told = 0;
+    QObject::connect(report.edit().verticalScrollBar(), &QScrollBar::rangeChanged, &report.edit(), [&told] { ++told; });
+    const QString place = widgetOf(*report.view).pageLabel().text();
+    int pieces = 0;
+    QObject::connect(report.edit().document(), &QTextDocument::contentsChange, &report.edit(), [&pieces] { ++pieces; });
+    QElapsedTimer time;
+    time.start();
+    ASSERT_TRUE(waitUntil([&] { return !report.edit().isLoading(); }));
+    EXPECT_GT(pieces, 2);
+    EXPECT_GE(told, 1);
+    EXPECT_LE(told, 2 + time.elapsed() / 200) << "painting the window for each piece takes longer than the piece";
+    EXPECT_GT(report.edit().verticalScrollBar()->maximum(), 59'000);
+    const kareport::ReportViewWidget &widget = widgetOf(*report.view);
+    EXPECT_TRUE(waitUntil([&widget] {
+        return widget.pageLabel().text() == QStringLiteral("Page 1 of %1").arg(widget.pageCount());
+    })) << widget.pageLabel().text().toStdString();
+    EXPECT_NE(widget.pageLabel().text(), place);
 }
 
 TEST(UReportViewLoad, TakesNoEditUntilAllOfItIsThere)
