@@ -53,6 +53,9 @@ bool UReportDoc::saveUnderChosenName(const QString &path, bool replace)
         }
         name = *chosen;
     }
+    if (!IsReportAvailable(this)) {
+        return false; // it was closed while the dialog was open
+    }
     {
         const kareport::WaitCursor cursor;
         isSaved = OnSaveDocument(name);
@@ -61,6 +64,9 @@ bool UReportDoc::saveUnderChosenName(const QString &path, bool replace)
         // A view that was updated may have closed the report.
         kareport::sayNotSaved(name, IsReportAvailable(this) ? saveProblem_ : QString());
         return false;
+    }
+    if (!IsReportAvailable(this)) {
+        return true; // what it told of the save has closed it
     }
     if (replace) {
         SetPathName(name, !isRichTextName(name) && !isPdfName(name));

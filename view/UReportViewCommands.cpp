@@ -72,7 +72,8 @@ std::vector<Command> UReportView::makeCommands()
         {fileCloseCommand,
          [this] {
              UReportDoc *report = GetDocument();
-             if (report != nullptr && report->EnableCloseOption() && report->SaveModified()) {
+             if (report != nullptr && report->EnableCloseOption() && report->SaveModified() &&
+                 UReportDoc::IsReportAvailable(report)) {
                  report->OnCloseDocument();
              }
          },

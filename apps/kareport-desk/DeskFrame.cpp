@@ -364,7 +364,7 @@ void DeskFrame::closeEvent(QCloseEvent *event)
         return;
     }
     for (UDocument *document : openDocuments()) {
-        if (isOpen(document) && !document->SaveModified()) {
+        if (isOpen(document) && !document->SaveModified() && isOpen(document)) {
             event->ignore();
             kareport::noteExitCancelled();
             return;

@@ -108,10 +108,11 @@ protected:
     void closeEvent(QCloseEvent *event) override
     {
         for (UDocument *report : std::vector(GetReportTemplate()->GetDocuments())) {
-            if (!UApplication::Get()->IsOpen(report)) {
-                continue; // it was closed while the user was asked about another one
+            if (!event->isAccepted() || !UApplication::Get()->IsOpen(report)) {
+                continue; // cancelled, or it was closed while the user was asked about another one
             }
-            event->setAccepted(event->isAccepted() && report->SaveModified()); // the user may cancel
+            // The user may cancel. A report that is closed while he is asked keeps nothing open.
+            event->setAccepted(report->SaveModified() || !UApplication::Get()->IsOpen(report));
         }
         if (!event->isAccepted()) {
             kareport::noteExitCancelled();

@@ -128,7 +128,8 @@ COneViewPane::CaptionState COneViewPane::GetCaptionState() const
 
 void COneViewPane::OnSysCommand(unsigned command, long /*parameter*/)
 {
-    if (command != scClose || !CanClosePane()) {
+    // The user is asked meanwhile, and whatever happens then may close the pane.
+    if (command != scClose || !CanClosePane() || !IsOpen(this)) {
         return;
     }
     UDocument *document = GetActiveDocument();

@@ -187,7 +187,12 @@ bool UDocument::SaveModified()
         return true;
     }
     const QString question = Xlate("Save changes to %1?").arg(title_.isEmpty() ? Xlate("Untitled") : title_);
-    switch (AppMessageBox(question, MessageButtons::YesNoCancel)) {
+    const std::weak_ptr<const bool> life = life_;
+    const MessageAnswer answer = AppMessageBox(question, MessageButtons::YesNoCancel);
+    if (life.expired()) {
+        return false; // it was closed while the question was open: there is nothing left to save or to close
+    }
+    switch (answer) {
     case MessageAnswer::Yes: return DoFileSave();
     case MessageAnswer::No: return true;
     default: return false;

@@ -65,7 +65,8 @@ public:
     /// Saves under the document's own path.
     bool DoFileSave();
 
-    /// Asks the user whether to save a modified document. @return false when the closing was cancelled
+    /// Asks the user whether to save a modified document. @return false when the closing was cancelled, and when the
+    /// document was closed while the question was open. What is told of a save may close it as well
     virtual bool SaveModified();
     /// Whether a pane that shows the document may be closed.
     virtual bool CanCloseFrame(CViewPane *pane);

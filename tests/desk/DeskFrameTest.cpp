@@ -411,6 +411,25 @@ TEST(DeskFrame, ClosingAsksForEveryReportThatHasChanged)
     }
 }
 
+TEST(DeskFrame, AReportThatClosesWhileItsQuestionIsOpenKeepsNothingOpen)
+{
+    for (const MessageAnswer answer : {MessageAnswer::Yes, MessageAnswer::No, MessageAnswer::Cancel}) {
+        Desk desk;
+        ASSERT_TRUE(desk.frame->OnCommand(fileNewCommand));
+        UReportDoc *report = Desk::reports().back();
+        report->WriteLine(QStringLiteral("x"), 0, 1, 0);
+        int questions = 0;
+        kareport::setMessageBox([&](const kareport::Message &) {
+            ++questions;
+            report->OnCloseDocument();
+            return answer;
+        });
+        desk.frame->close();
+        EXPECT_EQ(questions, 1);
+        EXPECT_FALSE(desk.frame->isVisible());
+    }
+}
+
 TEST(DeskFrame, LayoutAndRecentFilesComeBack)
 {
     const JobFolder folder;

@@ -9,6 +9,8 @@
 #include <QTemporaryDir>
 #include <QTranslator>
 
+#include <functional>
+
 namespace
 {
 
@@ -26,6 +28,9 @@ public:
         frame.show();
         kareport::setMessageBox([this](const kareport::Message &message) {
             messages.push_back(message);
+            if (meanwhile) {
+                meanwhile();
+            }
             return answer;
         });
     }
@@ -58,6 +63,7 @@ public:
     std::unique_ptr<UApplication> application = std::make_unique<UApplication>();
     MessageAnswer answer = MessageAnswer::Cancel;
     std::vector<kareport::Message> messages;
+    std::function<void()> meanwhile; ///< runs while a message is shown
 };
 
 /// A way in which a user closes a pane.
@@ -329,6 +335,75 @@ TEST(CReportViewPane, EveryPaneOfAHeldReportRefuses)
     ReportPanes::paneOf(*other).OnSysCommand(scClose, 0);
     EXPECT_FALSE(UReportDoc::IsReportAvailable(other)) << "another report closes";
     EXPECT_EQ(desk.messages.size(), 2U);
+}
+
+TEST(CReportViewPane, TheReportMayBeClosedWhileItsPaneAsks)
+{
+    for (const Way &way : ways) {
+        for (const MessageAnswer answer : {MessageAnswer::Yes, MessageAnswer::No, MessageAnswer::Cancel}) {
+            ReportPanes desk;
+            desk.answer = answer;
+            int saves = 0;
+            kareport::setSaveDialog([&saves](const kareport::SaveRequest &) -> std::optional<QString> {
+                ++saves;
+                return std::nullopt;
+            });
+            UReportDoc *report = ReportPanes::create(QStringLiteral("text\r\n"), true);
+            desk.meanwhile = [report] { report->OnCloseDocument(); };
+            way.close(ReportPanes::paneOf(*report));
+            EXPECT_EQ(desk.messages.size(), 1U) << way.name;
+            EXPECT_FALSE(UReportDoc::IsReportAvailable(report)) << way.name;
+            EXPECT_EQ(saves, 0) << way.name << ": there is nothing left to save";
+        }
+    }
+}
+
+TEST(CReportViewPane, ItsPanesMayBeClosedWhileTheReportStays)
+{
+    for (const Way &way : ways) {
+        ReportPanes desk;
+        desk.answer = MessageAnswer::No;
+        UReportDoc *report = ReportPanes::create(QStringLiteral("text\r\n"), true);
+        report->SetAutoDelete(false);
+        desk.meanwhile = [report] { report->OnCloseDocument(); };
+        way.close(ReportPanes::paneOf(*report));
+        ASSERT_TRUE(UReportDoc::IsReportAvailable(report)) << way.name;
+        EXPECT_TRUE(report->GetViews().empty()) << way.name;
+        report->SetAutoDelete(true);
+        report->OnCloseDocument();
+    }
+}
+
+TEST(CReportViewPane, TheReportMayBeClosedWhileItsNameIsAskedFor)
+{
+    for (const Way &way : ways) {
+        const QTemporaryDir folder;
+        const QString path = folder.filePath(QStringLiteral("a.rep"));
+        ReportPanes desk;
+        desk.answer = MessageAnswer::Yes;
+        UReportDoc *report = ReportPanes::create(QStringLiteral("text\r\n"), true);
+        kareport::setSaveDialog([&](const kareport::SaveRequest &) {
+            report->OnCloseDocument();
+            return std::optional(path);
+        });
+        way.close(ReportPanes::paneOf(*report));
+        EXPECT_FALSE(UReportDoc::IsReportAvailable(report)) << way.name;
+        EXPECT_FALSE(QFile::exists(path)) << way.name;
+        EXPECT_EQ(desk.messages.size(), 1U) << way.name << ": no word of a save that failed";
+    }
+}
+
+TEST(CReportViewPane, TheMenusCloseLikewise)
+{
+    for (const MessageAnswer answer : {MessageAnswer::Yes, MessageAnswer::No, MessageAnswer::Cancel}) {
+        ReportPanes desk;
+        desk.answer = answer;
+        UReportDoc *report = ReportPanes::create(QStringLiteral("text\r\n"), true);
+        desk.meanwhile = [report] { report->OnCloseDocument(); };
+        EXPECT_TRUE(dynamic_cast<UReportView *>(report->GetViews().front())->runCommand(57602));
+        EXPECT_EQ(desk.messages.size(), 1U);
+        EXPECT_FALSE(UReportDoc::IsReportAvailable(report));
+    }
 }
 
 } // namespace
