@@ -12,11 +12,28 @@ namespace kareport
 class KAREPORT_EXPORT ReportViewPort
 {
 public:
+    /// Whose pane a view stands in.
+    enum class Pane
+    {
+        OfHost,
+        OwnShown, ///< made by the report for itself, and shown
+        OwnHidden ///< the same, but the report has hidden it or has not shown it yet
+    };
+
     virtual ~ReportViewPort();
+    /// Loads the report's text where it was changed since and the view was not told, as a view that nobody sees is not.
+    /// Nothing in a view that always shows what the report holds.
+    virtual void loadIfStale() {}
     /// Writes what the view shows to an open device, as rich text. @return false as soon as a write fails
     virtual bool streamRichText(QIODevice &device) const = 0;
     /// The same as plain text of one byte a character. @return false as soon as a write fails
     virtual bool streamPlainText(QIODevice &device) const = 0;
+
+    Pane pane() const { return pane_; }
+    void setPane(Pane pane) { pane_ = pane; }
+
+private:
+    Pane pane_ = Pane::OfHost;
 };
 
 } // namespace kareport

@@ -39,7 +39,7 @@ UReportView::UReportView()
     widget->setLinesPerPage([this] { return GetDocument() != nullptr ? GetDocument()->GetLinesPerPage() : 0; });
     widget->setPageStarts([this] { return pageStartLines(); });
     widget->setPressHandler([this] { OnMouseActivate(); });
-    widget->setShowHandler([this] { loadIfStale(); });
+    widget->setShowHandler([this] { noteShown(); });
     edit_->setFocusHandler([this] { OnSetFocus(); });
     edit_->setEditHandler([this](const ReportChange &change) { takeEdit(change); });
     commands_ = makeCommands();
@@ -130,7 +130,6 @@ void UReportView::UpdateData(bool toView)
     }
     if (!toView) {
         takeText();
-        noteMirrored();
         report->UpdateAllViews(this, 0, nullptr);
         return;
     }
@@ -152,6 +151,14 @@ void UReportView::noteLoaded()
 {
     loadedLength_ = GetDocument()->GetTextLength();
     mirroredEdits_ = GetDocument()->GetEditCount();
+}
+
+void UReportView::noteShown()
+{
+    if (pane() == Pane::OwnHidden) {
+        setPane(Pane::OwnShown); // whoever has shown it: if it is hidden again, that is not the report's doing
+    }
+    loadIfStale();
 }
 
 void UReportView::loadIfStale()
@@ -210,10 +217,17 @@ void UReportView::noteMirrored()
     noteLoaded();
 }
 
+void UReportView::noteTaken()
+{
+    noteMirrored();
+    takenEdits_ = GetDocument()->GetEditCount();
+}
+
 void UReportView::SetRTFText(const QString &text)
 {
     isMirrored_ = false;
-    if (showsFormats_ && text == edit_->windowText()) {
+    const bool isTakenFromHere = GetDocument() != nullptr && takenEdits_ == GetDocument()->GetEditCount();
+    if (showsFormats_ && isTakenFromHere && text == edit_->windowText()) {
         return; // what was edited here has come back as the document's text: its formats stand in the control alone
     }
     showsFormats_ = kareport::isRichText(text);
@@ -230,11 +244,11 @@ void UReportView::SetRTFText(const QString &text)
 
 void UReportView::OnChange()
 {
-    if (UReportDoc *report = GetDocument()) {
-        UpdateData(false);
-        if (UReportDoc::IsReportAvailable(report)) { // an editor that takes it may have closed it
-            report->SetModifiedFlag(true);
-        }
+    UReportDoc *report = GetDocument();
+    if (report != nullptr && widget_) {
+        takeText();
+        report->SetModifiedFlag(true); // before others hear of it: an editor that takes it may close the report
+        report->UpdateAllViews(this, 0, nullptr);
     }
 }
 
@@ -251,12 +265,10 @@ void UReportView::takeEdit(const ReportChange &change)
     if (!isReplaced) {
         // Rich text, other line ends, or a text that was changed behind the view's back: the document takes over what
         // the control shows, and every further edit as the change it is.
-        if (!carryThrough(change)) {
-            report->SetData(edit_->windowText());
-        }
+        takeChanged(change);
         report->SetModifiedFlag(true);
     }
-    noteMirrored();
+    noteTaken();
     followPages(change);
     const std::weak_ptr<UView *const> self = GetHandle();
     toldChange_ = &change;

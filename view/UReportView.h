@@ -12,6 +12,7 @@
 #include <QString>
 
 #include <memory>
+#include <optional>
 #include <vector>
 
 class QPaintDevice;
@@ -89,6 +90,7 @@ public:
 
     bool streamRichText(QIODevice &device) const override;
     bool streamPlainText(QIODevice &device) const override;
+    void loadIfStale() override;
     const std::vector<kareport::Command> &commands() const override;
 
     // Printing
@@ -120,10 +122,17 @@ private:
     void WrapChanged();
     bool loadInPieces();
     void noteMirrored();
+    void noteTaken();
+    /// The lines of the control that pages begin with.
     std::vector<int> pageStartLines() const;
+    /// The same by the document's record, in a control of so many lines; nothing where the control shows another text.
+    std::optional<std::vector<int>> recordedStartLines(int lineCount) const;
+    /// Where pages begin in the control's text after an edit that the document has not taken over yet.
+    std::vector<qint64> startsAfter(const kareport::ReportChange &change) const;
     void forgetPages();
     void followPages(const kareport::ReportChange &change);
     bool carryThrough(const kareport::ReportChange &change);
+    void takeChanged(const kareport::ReportChange &change);
     void takeText();
     QRect printableRect() const; ///< twips
     void prepareRun(QPaintDevice *device);
@@ -137,7 +146,7 @@ private:
     void takeEdit(const kareport::ReportChange &change);
     void followEdit(const kareport::ReportChange &change);
     void noteLoaded();
-    void loadIfStale();
+    void noteShown();
     bool isStale() const; ///< whether the document has changed since, and the view was not told
 
     QPointer<QWidget> widget_;
@@ -154,8 +163,10 @@ private:
     mutable quint64 startLinesEdits_ = 0;    ///< its edits by then
     mutable qint64 startLinesLength_ = -1;   ///< its length by then; -1 when they are not known
     bool showsFormats_ = false;              ///< whether the control's text was rich text
-    QMargins m_rectMargin;                   ///< twips
-    QSize m_sizePaper;                       ///< twips
+    /// The document's edits when it took the control's text over last; nothing before.
+    std::optional<quint64> takenEdits_;
+    QMargins m_rectMargin; ///< twips
+    QSize m_sizePaper;     ///< twips
     std::vector<qint64> m_aPageStart;
     std::unique_ptr<kareport::PrintRun> run_; ///< of the job at hand
 };

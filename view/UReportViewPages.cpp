@@ -1,6 +1,6 @@
 #include "UReportView.h"
 
-#include "LineEndings.h"
+#include "ControlLines.h"
 #include "PageHeader.h"
 #include "ReportChange.h"
 #include "ReportEdit.h"
@@ -30,52 +30,42 @@ std::vector<int> asLines(const std::vector<qint64> &lines, int lineCount)
     return shown;
 }
 
-/// The blocks of a control that pages of a text begin with. Other line ends than CR LF are one character there.
-std::vector<int> blocksOfStarts(const QString &text, const std::vector<qint64> &starts)
-{
-    std::vector<int> blocks;
-    int block = 0;
-    qint64 at = 0;
-    for (const qint64 start : starts) {
-        for (; at < std::min<qint64>(start, text.size()); ++at) {
-            const QChar character = text[at];
-            const bool isPairsFirst = character == u'\r' && at + 1 < text.size() && text[at + 1] == u'\n';
-            block +=
-                (character == u'\r' && !isPairsFirst) || character == u'\n' || character == QChar::ParagraphSeparator
-                    ? 1
-                    : 0;
-        }
-        if (at < text.size() && (at == 0 || text[at - 1] == u'\n')) {
-            blocks.push_back(block);
-        }
-    }
-    return blocks;
-}
-
 } // namespace
 
 std::vector<int> UReportView::pageStartLines() const
 {
-    const UReportDoc *report = GetDocument();
-    if (report == nullptr || !widget_) {
+    if (GetDocument() == nullptr || !widget_) {
         return {};
     }
-    const int lineCount = edit_->document()->blockCount();
+    const QTextDocument &document = *edit_->document();
+    if (isMirrored_ && !isStale() && !GetDocument()->HoldsRichTextSource()) {
+        return kareport::blocksAt(document, GetDocument()->GetPageStarts());
+    }
+    const int lineCount = document.blockCount();
+    if (const auto lines = recordedStartLines(lineCount)) {
+        return *lines;
+    }
+    const QString shown = edit_->windowText();
+    return asLines(kareport::linesOfStarts(shown, kareport::pageHeadersIn(shown)), lineCount);
+}
+
+std::optional<std::vector<int>> UReportView::recordedStartLines(int lineCount) const
+{
     // Lines of the text are lines here, unless what is shown is another text: the document of a source, or an image that
     // was begun after the text.
-    const bool isImage = report->GetRTFDataFlag();
-    if (report->HoldsRichTextSource() || (isImage && report->CopyText().count(u'\n') + 1 != lineCount)) {
-        const QString shown = edit_->windowText();
-        return asLines(kareport::linesOfStarts(shown, kareport::pageHeadersIn(shown)), lineCount);
+    const UReportDoc &report = *GetDocument();
+    const bool isImage = report.GetRTFDataFlag();
+    if (report.HoldsRichTextSource() || (isImage && !kareport::hasLines(report.CopyText(), lineCount))) {
+        return std::nullopt;
     }
     if (!isImage && !isMirrored_ && !edit_->isLoading()) {
-        return blocksOfStarts(report->CopyText(), report->GetPageStarts());
+        return kareport::blocksOfStarts(report.CopyText(), report.GetPageStarts());
     }
     // Found once, also while the control gets its text piece by piece.
-    if (startLinesLength_ != report->GetTextLength() || startLinesEdits_ != report->GetEditCount()) {
-        startLines_ = report->GetPageStartLines();
-        startLinesLength_ = report->GetTextLength();
-        startLinesEdits_ = report->GetEditCount();
+    if (startLinesLength_ != report.GetTextLength() || startLinesEdits_ != report.GetEditCount()) {
+        startLines_ = report.GetPageStartLines();
+        startLinesLength_ = report.GetTextLength();
+        startLinesEdits_ = report.GetEditCount();
     }
     return asLines(startLines_, lineCount);
 }
@@ -113,31 +103,85 @@ bool UReportView::carryThrough(const ReportChange &change)
     // The document holds the control's text with other line ends: it is given the control's, and then the change, so that
     // its pages are carried along.
     UReportDoc &report = *GetDocument();
-    const QString before = kareport::withCrLf(report.CopyText());
+    kareport::ControlText before = kareport::controlText(report.CopyText(), report.GetPageStarts());
     const QString after = edit_->windowText();
     const QString inserted = change.documentInserted();
     const qint64 at = change.documentPosition();
     const qint64 behind = at + change.documentRemoved();
-    const bool isOne = before.size() == change.documentLengthBefore() && behind <= before.size() &&
-                       QStringView(before).first(at) == QStringView(after).first(at) &&
-                       QStringView(before).sliced(behind) == QStringView(after).sliced(at + inserted.size());
+    const bool isOne = before.text.size() == change.documentLengthBefore() && behind <= before.text.size() &&
+                       QStringView(before.text).first(at) == QStringView(after).first(at) &&
+                       QStringView(before.text).sliced(behind) == QStringView(after).sliced(at + inserted.size());
     if (!isOne || report.HoldsRichTextSource()) {
         return false;
     }
-    std::vector<qint64> starts = kareport::startsOfLines(before, report.GetPageStartLines());
-    report.SetData(before);
-    report.SetPageStarts(std::move(starts));
+    report.SetData(before.text);
+    report.SetPageStarts(std::move(before.starts));
     return report.ReplaceText(at, change.documentRemoved(), inserted);
+}
+
+std::vector<qint64> UReportView::startsAfter(const ReportChange &change) const
+{
+    const auto lines = isStale() ? std::nullopt : recordedStartLines(change.lineEndsInAll + 1);
+    if (!lines) {
+        return {}; // the headers in the text are all that is known
+    }
+    const QTextDocument &document = *edit_->document();
+    const QString inserted = change.documentInserted();
+    const qint64 at = change.documentPosition();
+    const qint64 behind = at + inserted.size();
+    const int lastRemoved = change.lineEndsBefore + change.lineEndsRemoved;
+    const int growth = static_cast<int>(change.inserted.count(u'\n')) - change.lineEndsRemoved;
+    const bool beginsLine = kareport::startOfBlock(document.findBlockByNumber(change.lineEndsBefore)) == at;
+    // A line that is put in at a page's start is the page's before, and a page whose text before it is removed stays. A
+    // start that stands within a line then counts again when the line end comes back.
+    const bool isPutBefore = change.removed == 0 && at > 0 && beginsLine && inserted.endsWith(u'\n');
+    std::vector<qint64> starts;
+    for (const int line : *lines) {
+        if (line > lastRemoved) {
+            starts.push_back(kareport::startOfBlock(document.findBlockByNumber(line + growth)));
+        } else if (line > change.lineEndsBefore) {
+            if (line == lastRemoved) {
+                starts.push_back(behind);
+            }
+        } else {
+            const qint64 start = kareport::startOfBlock(document.findBlockByNumber(line));
+            starts.push_back(start == at && isPutBefore ? behind : start);
+        }
+    }
+    for (const qint64 header : kareport::pageHeadersIn(inserted)) {
+        if (header > 0 || beginsLine) {
+            starts.push_back(at + header);
+        }
+    }
+    return starts;
+}
+
+void UReportView::takeChanged(const ReportChange &change)
+{
+    if (carryThrough(change)) {
+        return;
+    }
+    std::vector<qint64> starts = startsAfter(change);
+    GetDocument()->SetData(edit_->windowText());
+    if (!starts.empty()) {
+        GetDocument()->SetPageStarts(std::move(starts));
+    }
 }
 
 void UReportView::takeText()
 {
     UReportDoc &report = *GetDocument();
-    const QString before = report.CopyText();
-    const std::vector<qint64> lines = report.GetPageStartLines();
-    const QString text = edit_->windowText();
-    report.SetData(text);
-    if (kareport::withCrLf(before) == text) {
-        report.SetPageStarts(kareport::startsOfLines(text, lines));
+    const QString text = edit_->windowText(); // all of it has been loaded then
+    const QTextDocument &document = *edit_->document();
+    std::vector<qint64> starts;
+    if (!isStale()) {
+        for (const int line : pageStartLines()) {
+            starts.push_back(kareport::startOfBlock(document.findBlockByNumber(line)));
+        }
     }
+    report.SetData(text);
+    if (!starts.empty()) {
+        report.SetPageStarts(std::move(starts));
+    }
+    noteTaken();
 }

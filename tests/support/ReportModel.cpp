@@ -128,8 +128,8 @@ void ReportModel::withCrLf()
     for (Cell &cell : cells_) {
         cell.starts = false;
     }
-    startsAtEnd_ = false;
     // Only what begins a line is carried over.
+    startsAtEnd_ = startsAtEnd_ && (cells_.empty() || cells_.back().character == u'\n');
     for (const qint64 start : kept) {
         if (start < size() && beginsLine(start)) {
             cells_[static_cast<std::size_t>(start)].starts = true;

@@ -306,6 +306,46 @@ TEST(UReportViewEdit, AnEditedRichTextIsSavedWithItsFormats)
         << "a text that was set from elsewhere has no formats";
 }
 
+TEST(UReportViewEdit, FormatsGoWithATextThatAHostSets)
+{
+    for (const bool isEdited : {false, true}) {
+        ShownReport t(QStringLiteral("{\\rtf1 {\\b bold}\\par next}"));
+        UReportView &view = t.open();
+        if (isEdited) {
+            QTest::keyClick(&view.GetEdit(), Qt::Key_X);
+            t.report.UpdateAllViews(nullptr);
+            EXPECT_TRUE(view.ShowsFormats()) << "the text is the one that was typed here";
+        }
+        t.report.SetData(view.GetEdit().windowText());
+        t.report.UpdateAllViews(nullptr);
+        EXPECT_FALSE(view.ShowsFormats()) << "the very same characters, but from elsewhere; edited: " << isEdited;
+        QTextCursor cursor(view.GetEdit().document());
+        cursor.setPosition(2);
+        EXPECT_NE(cursor.charFormat().fontWeight(), QFont::Bold) << isEdited;
+    }
+}
+
+/// A view that keeps whether the report was modified when it was told of a change.
+class WatchingView : public UView
+{
+public:
+    void OnUpdate(UView *, long, void *) override { wasModified.push_back(GetDocument()->IsModified()); }
+    std::vector<bool> wasModified;
+};
+
+TEST(UReportViewEdit, OthersHearOfAReportThatIsModifiedAlready)
+{
+    ShownReport t(QStringLiteral("one\r\n"));
+    UReportView &view = t.open();
+    CViewPane pane;
+    auto *watching = showIn<WatchingView>(pane, t.report);
+    view.OnChange();
+    EXPECT_EQ(watching->wasModified, std::vector<bool>{true}) << "the whole text";
+    t.report.SetModifiedFlag(false);
+    QTest::keyClick(&view.GetEdit(), Qt::Key_X);
+    EXPECT_EQ(watching->wasModified, (std::vector<bool>{true, true})) << "a letter";
+}
+
 TEST(UReportViewEdit, AViewOfTheImageStaysAViewOfTheImage)
 {
     ShownReport t;
