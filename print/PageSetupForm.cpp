@@ -135,6 +135,7 @@ void PageSetupForm::addMargins(QVBoxLayout &layout)
         field->setRange(0, mostMargin);
         field->setSuffix(Xlate(" mm"));
         field->setValue(double(inOrder(setup_.margins).at(i)) / hundredths);
+        shownMargins_.at(i) = field->value();
         field->setAccessibleName(names.at(i));
         auto *label = plainLabel(labels.at(i));
         label->setBuddy(field);
@@ -184,7 +185,10 @@ PageSetup PageSetupForm::setup() const
     }
     std::array<int, 4> margins = inOrder(setup_.margins);
     for (std::size_t i = 0; i < margins_.size(); ++i) {
-        margins.at(i) = static_cast<int>(std::lround(margins_.at(i)->value() * hundredths));
+        // A margin that the field cannot show stays as it is until another one is entered.
+        if (margins_.at(i)->value() != shownMargins_.at(i)) {
+            margins.at(i) = static_cast<int>(std::lround(margins_.at(i)->value() * hundredths));
+        }
     }
     setup.margins = QMargins(margins[0], margins[1], margins[2], margins[3]);
     return setup;

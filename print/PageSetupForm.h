@@ -82,6 +82,7 @@ private:
     QRadioButton *measuredPages_;
     QLabel *warning_;
     std::array<QDoubleSpinBox *, 4> margins_ = {}; ///< left, top, right, bottom
+    std::array<double, 4> shownMargins_ = {};      ///< as they were given, as far as the fields can show them
 };
 
 } // namespace kareport

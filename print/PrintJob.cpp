@@ -56,9 +56,15 @@ private:
     }
 
     bool isWanted(int page) const { return ranges_.isEmpty() || ranges_.contains(page); }
-    bool isBehindLast(int page) const
+    /// Whether a page lies after those that are asked for. Says so where it is one that the limit leaves out.
+    bool isBehindLast(int page)
     {
-        return (lastPage_ > 0 && page > lastPage_) || (!ranges_.isEmpty() && page > ranges_.lastPage());
+        if (!ranges_.isEmpty() && page > ranges_.lastPage()) {
+            return true;
+        }
+        const bool isOverLimit = lastPage_ > 0 && page > lastPage_;
+        outcome_.isCut = isOverLimit && source_.find(painter_, page);
+        return isOverLimit;
     }
 
     void runForwards()

@@ -40,14 +40,16 @@ enum class PrintResult
 struct PrintOutcome
 {
     PrintResult result = PrintResult::Done;
-    QString reason; ///< what the system says; may be empty
-    int pages = 0;  ///< printed
+    QString reason;     ///< what the system says; may be empty
+    int pages = 0;      ///< printed
+    bool isCut = false; ///< whether more pages were left out for the limit
 };
 
 /// Prints the pages that the printer is set to, in its order. The windows of the program go on answering; after a moment one
 /// of them shows how far the job is and lets the user cancel it. A job that does not come to its end leaves nothing in a
 /// print queue, and an earlier file as it was.
-/// @param lastPage  stops there, for a preview that cannot hold more; 0 for no limit
+/// @param lastPage  stops there, for a preview that cannot hold more, and says in the outcome whether there is a page
+///                  after it; 0 for no limit
 KAREPORT_EXPORT PrintOutcome printPages(QPrinter &printer, const PrintSource &source, QWidget *parent,
                                         int lastPage = 0);
 

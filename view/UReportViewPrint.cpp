@@ -2,7 +2,6 @@
 
 #include "AppMessageBox.h"
 #include "MarginPicture.h"
-#include "PageHeader.h"
 #include "Preferences.h"
 #include "PrintDialogs.h"
 #include "PrintGeometry.h"
@@ -18,10 +17,12 @@
 #include <QPaintEngine>
 #include <QPainter>
 #include <QPrinter>
+#include <QTextBlock>
 #include <QTextDocument>
 
 #include <memory>
 #include <stdexcept>
+#include <utility>
 
 namespace
 {
@@ -76,18 +77,15 @@ void sayNoRoom()
     AppMessageBox(Xlate("The margins leave no room for text on the paper. Choose smaller margins under Page Setup."));
 }
 
-/// Matches the page model with the printer. @return false, having said so, when the page has no room for text
-bool hasRoom(UReportDoc &report)
+/// Matches the page model with the printer.
+/// @return whether the page has room for text. Also where there is no printer: preparing the job says so
+bool measureRoom(UReportDoc &report)
 {
     if (report.SetPageSize() == 0) {
-        return true; // preparing the job says that there is no printer
-    }
-    const QSize sheet = kareport::twipsOfDots(report.GetPageSize(), report.GetPrintResolution());
-    if (kareport::leavesRoom(sheet, kareport::twipsOfHundredths(report.GetMargins()))) {
         return true;
     }
-    sayNoRoom();
-    return false;
+    const QSize sheet = kareport::twipsOfDots(report.GetPageSize(), report.GetPrintResolution());
+    return kareport::leavesRoom(sheet, kareport::twipsOfHundredths(report.GetMargins()));
 }
 
 PrintOutcome printText(UReportView &view, QPrinter &printer, PrintInfo &info, int lastPage)
@@ -146,7 +144,9 @@ QString nameOf(const QPrinter &printer)
 
 void UReportView::OnReportPrint(bool direct)
 {
-    if (GetDocument() != nullptr && !hasRoom(*GetDocument())) {
+    // Where the user is asked, another sheet may be chosen.
+    if (GetDocument() != nullptr && !measureRoom(*GetDocument()) && direct) {
+        sayNoRoom();
         return;
     }
     const ReportOrientation orientation;
@@ -165,7 +165,8 @@ void UReportView::OnReportPrint(bool direct)
 
 void UReportView::OnReportPrintPreview()
 {
-    if (GetDocument() != nullptr && !hasRoom(*GetDocument())) {
+    if (GetDocument() != nullptr && !measureRoom(*GetDocument())) {
+        sayNoRoom();
         return;
     }
     const ReportOrientation orientation;
@@ -174,9 +175,7 @@ void UReportView::OnReportPrintPreview()
     if (!OnPreparePrinting(info)) {
         return;
     }
-    if (info.maxPage > mostPreviewPages) {
-        AppMessageBox(Xlate("The preview shows the first %1 pages. All pages are printed.").arg(mostPreviewPages));
-    }
+    bool isCutSaid = false;
     const PrintedText text(*this);
     const QSize preparedSheet = kareport::sheetInTwips(*info.printer);
     const QSize preparedPaper = m_sizePaper;
@@ -187,10 +186,16 @@ void UReportView::OnReportPrintPreview()
         const QSize sheet = kareport::sheetInTwips(printer);
         m_sizePaper = sheet == preparedSheet ? preparedPaper : sheet; // turned or changed in the preview
         const bool prints = printer.paintEngine()->type() != QPaintEngine::Picture;
+        if (prints && !kareport::leavesRoom(m_sizePaper, m_rectMargin)) {
+            sayNoRoom();
+            return;
+        }
         PrintInfo shown = info;
         const PrintOutcome outcome = printText(*this, printer, shown, prints ? 0 : mostPreviewPages);
         if (prints) {
             sayOutcome(outcome, nameOf(printer));
+        } else if (outcome.isCut && !std::exchange(isCutSaid, true)) {
+            AppMessageBox(Xlate("The preview shows the first %1 pages. All pages are printed.").arg(mostPreviewPages));
         }
     });
     if (text.isOpen()) {
@@ -355,9 +360,10 @@ std::vector<kareport::PrintSheet> UReportView::givenSheets(kareport::LinePager &
     }
     // The pages of what is shown: formats and line ends make the places of characters differ from those in the report.
     const QString shown = pager.text().toPlainText();
-    const std::vector<qint64> starts = report->HoldsRichTextSource()
-                                           ? kareport::pageHeadersIn(shown)
-                                           : kareport::startsOfLines(shown, report->GetPageStartLines());
+    std::vector<qint64> starts;
+    for (const int line : pageStartLines()) {
+        starts.push_back(pager.text().findBlockByNumber(line).position());
+    }
     const int lines = report->GetLinesPerPage();
     return kareport::printSheets(pager, printableRect(), kareport::reportPages(QStringView(shown), starts, lines),
                                  lines);
@@ -408,7 +414,12 @@ void UReportView::OnPageSetup()
     report->UseGivenPage(setup.keepsGivenPages);
     report->SetPageSize();
     report->SaveSettings();
-    static_cast<kareport::ReportViewWidget *>(GetWidget())->showPlace();
+    for (UView *view : report->GetViews()) {
+        const auto *shown = dynamic_cast<UReportView *>(view);
+        if (shown != nullptr && shown->widget_) {
+            static_cast<kareport::ReportViewWidget *>(shown->widget_.data())->showPlace();
+        }
+    }
     // After the measurement, which the next print command repeats: the report that is open keeps its pages till then.
     SetReportPrinterSetToPortrait(UPreviewDlg::IsModulePrinterOrientationPortrait());
 }

@@ -1,6 +1,7 @@
 #include "UReportView.h"
 
 #include "JobRunnerFixture.h"
+#include "PageHeader.h"
 #include "PdfReadBack.h"
 #include "PrintFixture.h"
 #include "RichTextReader.h"
@@ -368,6 +369,89 @@ TEST(UReportViewGivenPages, EditedRichTextHasThePagesOfItsHeaders)
         const QString header = sheets.at(page - 1).trimmed().section(u'\n', 0, 0);
         EXPECT_TRUE(header.startsWith(QStringLiteral("TALVEN - Points"))) << header.toStdString();
         EXPECT_TRUE(header.endsWith(QString::number(page))) << header.toStdString();
+    }
+}
+
+TEST(UReportViewGivenPages, LineEndsOfOneCharacterMoveNoPage)
+{
+    for (const QChar lineEnd : {QChar(u'\r'), QChar(QChar::ParagraphSeparator), QChar(QChar::LineSeparator)}) {
+        AnsweredPrinting printing;
+        ShownReport report;
+        report.report.FixPage(12, 80);
+        report.report.SetHeaderFlag(false);
+        for (int page = 1; page <= 3; ++page) {
+            if (page > 1) {
+                report.report.NewPage(-1);
+            }
+            report.report.WriteLine(QStringLiteral("page %1").arg(page), 0, 1, 0);
+            report.report.WriteLine(QStringLiteral("second") + lineEnd + QStringLiteral("third"), 0, 1, 0);
+        }
+        UReportView &view = report.open();
+        for (int page = 1; page <= 3; ++page) {
+            widgetOf(view).goToPage(page);
+            EXPECT_EQ(view.GetEdit().textCursor().block().text(), QStringLiteral("page %1").arg(page))
+                << int(lineEnd.unicode());
+        }
+        view.OnReportPrint();
+        EXPECT_THAT(firstLines(readBack(printing.file()), 6), ElementsAre("page 1", "page 2", "page 3"))
+            << int(lineEnd.unicode());
+    }
+}
+
+TEST(UReportViewGivenPages, ABreakWithinALineOfEditedRichTextMovesNoPage)
+{
+    AnsweredPrinting printing;
+    ShownReport report;
+    const auto header = [](int page) {
+        return kareport::pageHeaderLine(QStringLiteral("A"), QStringLiteral("T"),
+                                        QDateTime(QDate(2024, 3, 5), QTime(14, 7)), QStringLiteral("   Page:"), 80) +
+               QString::number(page);
+    };
+    QString source = QStringLiteral("{\\rtf1 ");
+    for (int page = 1; page <= 3; ++page) {
+        source += header(page) + QStringLiteral("\\par second\\line third\\par ");
+    }
+    report.report.SetData(source + u'}');
+    report.report.FixPage(12, 80);
+    UReportView &view = report.open();
+    putCursor(view.GetEdit(), static_cast<int>(view.GetEdit().toPlainText().indexOf(QStringLiteral("third"))));
+    QTest::keyClick(&view.GetEdit(), Qt::Key_X);
+    ASSERT_EQ(report.report.GetPages().size(), 3U);
+    for (int page = 1; page <= 3; ++page) {
+        widgetOf(view).goToPage(page);
+        EXPECT_EQ(view.GetEdit().textCursor().block().text(), header(page));
+    }
+    view.OnReportPrint();
+    const QStringList sheets = readBack(printing.file()).pages();
+    ASSERT_EQ(sheets.size(), 3);
+    for (int page = 1; page <= 3; ++page) {
+        EXPECT_TRUE(sheets.at(page - 1).trimmed().section(u'\n', 0, 0).endsWith(QString::number(page))) << page;
+    }
+}
+
+TEST(UReportViewGivenPages, AnImageThatWasBegunLateHasThePagesOfItsHeaders)
+{
+    AnsweredPrinting printing;
+    ShownReport report;
+    report.report.FixPage(20, 80);
+    report.report.SetTitle(QStringLiteral("Points"));
+    report.report.SetHeaderFlag(true);
+    for (int line = 0; line < 30; ++line) {
+        report.report.WriteLine(QStringLiteral("text %1").arg(line), 0, 1, 0);
+    }
+    report.report.SetRTFDataFlag(true);
+    for (int line = 0; line < 50; ++line) {
+        report.report.WriteLine(QStringLiteral("image %1").arg(line), 0, 1, 0);
+    }
+    UReportView &view = report.open();
+    ASSERT_TRUE(view.ShowsFormats());
+    view.OnReportPrint();
+    const QStringList sheets = readBack(printing.file()).pages();
+    ASSERT_GE(sheets.size(), 3);
+    EXPECT_TRUE(sheets.at(0).trimmed().startsWith(QStringLiteral("image 0"))) << "the end of a page";
+    EXPECT_EQ(sheets.size(), widgetOf(view).pageCount());
+    for (const QString &sheet : sheets.sliced(1)) {
+        EXPECT_TRUE(sheet.trimmed().startsWith(QStringLiteral("TALVEN - Points"))) << sheet.toStdString();
     }
 }
 

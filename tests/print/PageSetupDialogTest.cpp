@@ -319,4 +319,16 @@ TEST(PageSetupDialog, CancelLeavesTheSetupThatWasGiven)
     EXPECT_EQ(setup.margins, usualSetup().margins);
 }
 
+TEST(PageSetupDialog, AMarginThatTheFieldCannotShowStaysUntilItIsChanged)
+{
+    PageSetup setup = usualSetup();
+    setup.margins = QMargins(-500, 300000, 1200, 200001); // hundredths: the fields show 0 to 2000 mm
+    PageSetupDialog dialog(setup);
+    EXPECT_EQ(field(dialog, "Left margin")->value(), 0.0);
+    EXPECT_EQ(field(dialog, "Top margin")->value(), 2000.0);
+    EXPECT_EQ(dialog.setup().margins, setup.margins) << "nobody has touched them";
+    field(dialog, "Top margin")->setValue(12.34);
+    EXPECT_EQ(dialog.setup().margins, QMargins(-500, 1234, 1200, 200001)) << "but for one";
+}
+
 } // namespace

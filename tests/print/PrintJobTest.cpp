@@ -101,11 +101,39 @@ TEST(PrintJob, NothingToPrintLeavesTheFileAsItWas)
     }
 }
 
-TEST(PrintJob, StopsAtTheLastPageThatIsAskedFor)
+TEST(PrintJob, StopsAtTheLastPageThatIsAskedForAndSaysWhatIsLeftOut)
 {
+    struct Row
+    {
+        int pages;
+        int lastPage;
+        QPrinter::PageOrder order;
+        std::vector<int> printed;
+        bool isCut;
+        const char *reason;
+    };
+    const Row rows[] = {
+        {5, 2, QPrinter::FirstPageFirst, {1, 2}, true, "three pages are left out"},
+        {3, 2, QPrinter::FirstPageFirst, {1, 2}, true, "one is"},
+        {2, 2, QPrinter::FirstPageFirst, {1, 2}, false, "just as many"},
+        {1, 2, QPrinter::FirstPageFirst, {1}, false, "fewer"},
+        {5, 0, QPrinter::FirstPageFirst, {1, 2, 3, 4, 5}, false, "no limit"},
+        {5, 2, QPrinter::LastPageFirst, {2, 1}, true, "backwards"},
+        {2, 2, QPrinter::LastPageFirst, {2, 1}, false, "just as many, backwards"},
+    };
+    for (const Row &row : rows) {
+        PagedText text;
+        NumberedPages pages(row.pages);
+        text.printer().setPageOrder(row.order);
+        const PrintOutcome outcome = kareport::printPages(text.printer(), pages.source, nullptr, row.lastPage);
+        EXPECT_EQ(outcome.result, PrintResult::Done) << row.reason;
+        EXPECT_EQ(pages.printed, row.printed) << row.reason;
+        EXPECT_EQ(outcome.isCut, row.isCut) << row.reason;
+    }
     PagedText text;
-    NumberedPages pages(9);
-    EXPECT_EQ(kareport::printPages(text.printer(), pages.source, nullptr, 4).pages, 4);
+    NumberedPages pages(5);
+    text.printer().setFromTo(1, 2);
+    EXPECT_FALSE(kareport::printPages(text.printer(), pages.source, nullptr, 2).isCut) << "nobody asks for more";
 }
 
 TEST(PrintJob, WindowsAnswerWhileItPrintsAndTheProgressIsShown)

@@ -66,7 +66,11 @@ std::vector<PdfWord> PdfReadBack::words(int page) const
     std::vector<PdfWord> words;
     for (auto match = word.globalMatch(text); match.hasNext();) {
         const auto found = match.next();
-        words.push_back({found.captured(5), found.captured(1).toDouble(), found.captured(2).toDouble(),
+        QString written = found.captured(5);
+        written.replace(QStringLiteral("&lt;"), QStringLiteral("<"));
+        written.replace(QStringLiteral("&gt;"), QStringLiteral(">"));
+        written.replace(QStringLiteral("&amp;"), QStringLiteral("&"));
+        words.push_back({written, found.captured(1).toDouble(), found.captured(2).toDouble(),
                          found.captured(3).toDouble(), found.captured(4).toDouble()});
     }
     return words;

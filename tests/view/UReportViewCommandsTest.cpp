@@ -1,5 +1,6 @@
 #include "FindBar.h"
 #include "PageBar.h"
+#include "PrintFixture.h"
 #include "ReportCommandIds.h"
 #include "ViewFixture.h"
 
@@ -36,6 +37,74 @@ TEST(UReportViewCommands, EveryCommandIsKnownByItsNumber)
     EXPECT_FALSE(view.runCommand(61536));
     EXPECT_FALSE(view.updateCommand(1, state));
     EXPECT_FALSE(view.runCommand(57600)) << "a new report is not made by a view";
+}
+
+TEST(UReportViewCommands, PrintCommandsDoWhatTheirNumbersSay)
+{
+    struct Row
+    {
+        unsigned id;
+        int prints;
+        int previews;
+        std::size_t setups;
+        bool isDirect;
+        const char *name;
+    };
+    constexpr Row rows[] = {
+        {57606, 0, 0, 1, false, "Page Setup"},       {57607, 1, 0, 0, false, "Print"},
+        {33236, 1, 0, 0, false, "the host's Print"}, {57608, 0, 0, 0, true, "Print Direct"},
+        {57609, 0, 1, 0, false, "Print Preview"},    {33237, 0, 1, 0, false, "the host's Print Preview"},
+    };
+    const QTemporaryDir home;
+    const QByteArray homeBefore = qgetenv("HOME");
+    qputenv("HOME", QFile::encodeName(home.path()));
+    for (const Row &row : rows) {
+        const AnsweredPrinting printing;
+        ShownReport t(QStringLiteral("a"));
+        t.report.SetTitle(QStringLiteral("Directly"));
+        EXPECT_TRUE(t.open().runCommand(row.id)) << row.name;
+        EXPECT_EQ(printing.prints, row.prints) << row.name;
+        EXPECT_EQ(printing.previews, row.previews) << row.name;
+        EXPECT_EQ(printing.setups.size(), row.setups) << row.name;
+        const QString direct = home.filePath(QStringLiteral("Directly.pdf"));
+        EXPECT_EQ(pagesIn(direct), row.isDirect ? 1 : -1) << row.name;
+        QFile::remove(direct);
+    }
+    qputenv("HOME", homeBefore);
+}
+
+/// A host's document that counts the texts it is given.
+class CountingReceiver : public UDocument
+{
+public:
+    explicit CountingReceiver(int &texts) : texts_(texts) {}
+    bool OnTextReceived(unsigned id, const QString &text) override
+    {
+        texts_ += id == 5 && !text.isEmpty() ? 1 : 0;
+        return true;
+    }
+
+private:
+    int &texts_;
+};
+
+TEST(UReportViewCommands, UpdateTextSendsTheTextToItsObject)
+{
+    int texts = 0;
+    UApplication application;
+    UDocTemplate *receivers = application.AddDocTemplate(std::make_unique<UDocTemplate>(
+        9, [&texts] { return std::make_unique<CountingReceiver>(texts); }, UDocTemplate::PaneFactory(),
+        UDocTemplate::ViewFactory(), QStringLiteral("Receivers"), 0, 0));
+    UDocument *receiver = receivers->OpenReportDocumentFile(QString(), 0, 0, nullptr, 0, nullptr);
+    ShownReport t(QStringLiteral("text"));
+    UReportView &view = t.open();
+    EXPECT_TRUE(view.runCommand(32771));
+    EXPECT_EQ(texts, 0) << "there is none";
+    t.report.SetTextObject(receiver, 5);
+    EXPECT_TRUE(view.runCommand(32771));
+    EXPECT_EQ(texts, 1);
+    UReportView().OnSaveReportText(); // a view without a report has nothing to send
+    EXPECT_EQ(texts, 1);
 }
 
 TEST(UReportViewCommands, UpdateTextIsEnabledWhileTheReportHasATextObject)

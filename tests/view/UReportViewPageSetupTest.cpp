@@ -2,6 +2,8 @@
 
 #include "PrintFixture.h"
 
+#include <QLabel>
+
 #include <gtest/gtest.h>
 
 namespace
@@ -80,6 +82,21 @@ TEST(UReportViewPageSetup, SelectsThePrinter)
     printing.changeSetup = [](kareport::PageSetup &setup) { setup.printer = QStringLiteral("Other"); };
     view.OnPageSetup();
     EXPECT_EQ(kareport::defaultPrinter().name, QStringLiteral("Plotter"));
+}
+
+TEST(UReportViewPageSetup, EveryViewOfTheReportShowsTheNewPagesAtOnce)
+{
+    AnsweredPrinting printing;
+    ShownReport report;
+    writeLines(report.report, 200);
+    UReportView &view = report.open();
+    UReportView &other = report.open();
+    QCoreApplication::processEvents();
+    const QString before = widgetOf(other).pageLabel().text();
+    printing.changeSetup = [](kareport::PageSetup &setup) { setup.margins.setBottom(20000); };
+    view.OnPageSetup();
+    EXPECT_NE(widgetOf(view).pageLabel().text(), before);
+    EXPECT_EQ(widgetOf(other).pageLabel().text(), widgetOf(view).pageLabel().text());
 }
 
 } // namespace

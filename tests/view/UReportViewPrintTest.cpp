@@ -1,8 +1,11 @@
 #include "UReportView.h"
 
+#include "PdfReadBack.h"
 #include "PrintFixture.h"
 
 #include <QFile>
+#include <QPrintPreviewWidget>
+#include <QTranslator>
 
 #include <gmock/gmock.h>
 
@@ -289,6 +292,47 @@ TEST(UReportViewPrint, WithoutAPrinterEveryCommandSaysSo)
     EXPECT_FALSE(UPreviewDlg::IsModulePrinterOrientationPortrait()) << "put back";
 }
 
+/// Gives every text back in brackets.
+class Translator : public QTranslator
+{
+public:
+    Translator() { QCoreApplication::installTranslator(this); }
+    ~Translator() override { QCoreApplication::removeTranslator(this); }
+
+    QString translate(const char * /*context*/, const char *text, const char * /*note*/, int /*number*/) const override
+    {
+        return u'[' + QString::fromUtf8(text) + u']';
+    }
+    bool isEmpty() const override { return false; }
+};
+
+TEST(UReportViewPrint, WithoutAPrinterTheBoxesAreTheUsualOnes)
+{
+    const AnsweredPrinting printing;
+    ShownReport report;
+    UReportView &view = report.open();
+    kareport::setDefaultPrinter({kareport::PrinterSource::None});
+    std::vector<kareport::Message> messages;
+    kareport::setMessageBox([&messages](const kareport::Message &message) {
+        messages.push_back(message);
+        return MessageAnswer::Ok;
+    });
+    {
+        const Translator translator;
+        view.OnReportPrint();
+        view.OnPageSetup();
+    }
+    kareport::setMessageBox({});
+    ASSERT_EQ(messages.size(), 2U);
+    EXPECT_EQ(messages[0].text, QStringLiteral("No Default Printer is Installed!!!")) << "in every language";
+    EXPECT_EQ(messages[1].text, QStringLiteral("[Failed to get default printer settings.]"));
+    for (const kareport::Message &message : messages) {
+        EXPECT_EQ(message.buttons, MessageButtons::Ok) << message.text.toStdString();
+        EXPECT_EQ(message.icon, kareport::MessageIcon::None) << message.text.toStdString();
+        EXPECT_EQ(message.caption, QString()) << message.text.toStdString();
+    }
+}
+
 TEST(UReportViewPrint, MarginsThatLeaveNoRoomAreReportedInsteadOfPrinted)
 {
     for (const QMargins &margins :
@@ -300,11 +344,168 @@ TEST(UReportViewPrint, MarginsThatLeaveNoRoomAreReportedInsteadOfPrinted)
         writeLines(report.report, 3);
         report.report.SetMargins(margins);
         UReportView &view = report.open();
-        view.OnReportPrint();
+        view.OnReportPrint(true);
         view.OnReportPrintPreview();
         EXPECT_EQ(messages.texts.size(), 2);
         EXPECT_TRUE(messages.texts.value(0).contains(QStringLiteral("Page Setup")));
         EXPECT_EQ(printing.prints + printing.previews, 0);
+        view.OnReportPrint();
+        EXPECT_EQ(printing.prints, 1) << "a larger sheet might be chosen";
+        EXPECT_EQ(messages.texts.size(), 3) << "none was";
+        EXPECT_FALSE(QFile::exists(printing.file()));
+    }
+}
+
+TEST(UReportViewPrint, ALargerSheetThatTheUserChoosesHasRoom)
+{
+    AnsweredPrinting printing;
+    printing.changePrinter = [](QPrinter &printer) { printer.setPageSize(QPageSize(QPageSize::A3)); };
+    const AnsweredMessages messages(MessageAnswer::Ok);
+    ShownReport report;
+    writeLines(report.report, 3);
+    report.report.SetMargins(QMargins(10500, 1000, 10000, 1000)); // 5 mm are left on A4, 92 on A3
+    report.open().OnReportPrint();
+    EXPECT_EQ(printing.prints, 1);
+    EXPECT_EQ(printing.printedPages(), 1);
+    EXPECT_THAT(messages.texts, IsEmpty());
+}
+
+/// Lets a preview change its sheet and print.
+void previewWith(const std::function<void(QPrinter &, const std::function<void(QPrinter &)> &)> &act)
+{
+    kareport::PrintDialogs dialogs;
+    dialogs.preview = [act](QPrinter &printer, QWidget *, const std::function<void(QPrinter &)> &paint) {
+        act(printer, paint);
+    };
+    kareport::setPrintDialogs(dialogs);
+}
+
+TEST(UReportViewPrint, ASheetWithoutRoomThatIsChosenInThePreviewIsRefused)
+{
+    const AnsweredPrinting printing; // puts Qt's windows back
+    const AnsweredMessages messages(MessageAnswer::Ok);
+    ShownReport report;
+    writeLines(report.report, 3);
+    report.report.SetMargins(QMargins(6000, 1000, 6000, 1000)); // room on A4, none on A6
+    UReportView &view = report.open();
+    previewWith([&](QPrinter &printer, const std::function<void(QPrinter &)> &paint) {
+        printer.setOutputFileName(printing.file());
+        printer.setPageSize(QPageSize(QPageSize::A6));
+        paint(printer);
+        EXPECT_FALSE(QFile::exists(printing.file())) << "no blank sheet";
+        printer.setPageSize(QPageSize(QPageSize::A4));
+        paint(printer);
+    });
+    view.OnReportPrintPreview();
+    EXPECT_THAT(messages.texts,
+                ElementsAre(testing::Truly([](const QString &text) { return text.contains(u"Page Setup"); })));
+    EXPECT_EQ(printing.printedPages(), 1) << "back on A4";
+}
+
+TEST(UReportViewPrint, APreviewSaysWhenItDoesNotShowAllPages)
+{
+    struct Row
+    {
+        int lines;
+        bool isCut;
+        const char *reason;
+    };
+    // Three rows a page; each line takes two of them.
+    for (const Row &row : {Row{3000, false, "2000 pages"}, Row{3001, true, "2001 pages, 1001 of them counted"}}) {
+        const AnsweredPrinting printing;
+        const AnsweredMessages messages(MessageAnswer::Ok);
+        ShownReport report;
+        report.report.SetMargins(QMargins(1000, 1000, 21000 - 1000 - 1050, 29700 - 1000 - 1050));
+        report.report.SetHeaderFlag(false);
+        report.report.SetData(QStringLiteral("12345678\r\n").repeated(row.lines).chopped(2));
+        UReportView &view = report.open();
+        int shown = 0;
+        int paints = 0;
+        previewWith([&](QPrinter &printer, const std::function<void(QPrinter &)> &paint) {
+            QPrintPreviewWidget widget(&printer);
+            QObject::connect(&widget, &QPrintPreviewWidget::paintRequested, &widget, [&](QPrinter *target) {
+                ++paints;
+                paint(*target);
+            });
+            widget.updatePreview();
+            widget.updatePreview(); // as when it is turned
+            shown = widget.pageCount();
+        });
+        view.OnReportPrintPreview();
+        EXPECT_GE(paints, 2) << row.reason;
+        EXPECT_EQ(shown, 2000) << row.reason;
+        EXPECT_EQ(messages.texts.size(), row.isCut ? 1 : 0) << row.reason << ": said once";
+        EXPECT_EQ(messages.texts.value(0).contains(QStringLiteral("2000")), row.isCut) << row.reason;
+    }
+}
+
+TEST(UReportViewPrint, ThePrintedTextStandsAtTheMarginsInItsSize)
+{
+    struct Row
+    {
+        QMargins margins; ///< hundredths of a millimetre
+        int fixedLines;   ///< of the page; 0 for a measured page
+        double left;      ///< points
+        double top;
+        double size; ///< of the type
+        const char *reason;
+    };
+    const Row rows[] = {
+        {{1000, 1000, 1200, 2000}, 0, 28.35, 28.35, 8, "567 twips, type of 8 points"},
+        {{2540, 5080, 1200, 2000}, 0, 72, 144, 8, "an inch, and two"},
+        {{1000, 1000, 1200, 2000}, 40, 28.35, 28.35, 8, "a given page that has room"},
+        {{1000, 1000, 1200, 2000},
+         120,
+         28.35,
+         28.35,
+         5.37,
+         "one of 120 lines, for which the sheet has room in smaller type"},
+        {{2540, 5080, 1200, 2000}, 100, 72, 144, 5.46, "and at other margins"},
+    };
+    for (const Row &row : rows) {
+        const AnsweredPrinting printing;
+        ShownReport report;
+        report.report.SetMargins(row.margins);
+        if (row.fixedLines > 0) {
+            report.report.FixPage(row.fixedLines, 80);
+        }
+        writeLines(report.report, std::max(3, row.fixedLines));
+        report.open().OnReportPrint();
+        QFile file(printing.file());
+        ASSERT_TRUE(file.open(QIODevice::ReadOnly)) << row.reason;
+        const PdfReadBack pdf(file.readAll());
+        EXPECT_EQ(pdf.pageCount(), 1) << row.reason;
+        const std::vector<PdfWord> words = pdf.words();
+        ASSERT_GE(words.size(), 4U) << row.reason;
+        EXPECT_EQ(words[0].text, QStringLiteral("line")) << row.reason;
+        EXPECT_NEAR(words[0].left, row.left, 0.2) << row.reason;
+        EXPECT_NEAR(words[0].top, row.top, 1.0) << row.reason;
+        constexpr double cell = 0.602; // of the type's size
+        EXPECT_NEAR((words[1].left - words[0].left) / 5 / cell, row.size, 0.05) << row.reason;
+        EXPECT_EQ(words[2].text, QStringLiteral("line")) << row.reason;
+        EXPECT_NEAR(words[2].left, row.left, 0.2) << row.reason;
+        EXPECT_NEAR((words[2].top - words[0].top) / row.size, 1.17, 0.02) << "the next line; " << row.reason;
+    }
+}
+
+TEST(UReportViewPrint, MarginsAreDrawnAroundThePrintedText)
+{
+    PreparedView prepared(3, QMargins(2540, 5080, 2540, 15240));
+    {
+        QPainter painter(&prepared.printer);
+        prepared.view->DrawMargins(painter);
+        QPainter idle;
+        prepared.view->DrawMargins(idle);
+    }
+    QFile file(prepared.printing.file());
+    ASSERT_TRUE(file.open(QIODevice::ReadOnly));
+    const std::vector<PdfWord> words = PdfReadBack(file.readAll()).words();
+    // A4 is 842 points high; 842 - 144 - 432 points are 26 rows of 10.
+    ASSERT_EQ(words.size(), 26U);
+    for (std::size_t i = 0; i < words.size(); ++i) {
+        EXPECT_EQ(words[i].text, QStringLiteral("%1->>").arg(i));
+        EXPECT_NEAR(words[i].left, 72, 0.2) << i;
+        EXPECT_NEAR(words[i].top, 144 + 10.0 * static_cast<double>(i), 1.5) << i;
     }
 }
 
