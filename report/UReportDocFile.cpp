@@ -232,9 +232,11 @@ void UReportDoc::sendText()
 {
     QString edited;
     for (UView *view : kareport::reportViews(*this)) {
+        auto *port = dynamic_cast<kareport::ReportViewPort *>(view);
+        port->loadIfStale(); // the report was written again, and the view is hidden
         QBuffer bytes;
         bytes.open(QIODevice::WriteOnly);
-        if (dynamic_cast<const kareport::ReportViewPort *>(view)->streamPlainText(bytes) && bytes.size() > 0) {
+        if (port->streamPlainText(bytes) && bytes.size() > 0) {
             // The receiving side expects the bytes of the plain text two to a character.
             edited = kareport::textOfBytes(bytes.data());
         }

@@ -16,13 +16,9 @@ bool ReportWindowCommands::hasReport() const
     return window_.IsActive() && window_.GetReportDoc() != nullptr;
 }
 
-UReportView *ReportWindowCommands::loadedView() const
+UReportView *ReportWindowCommands::view() const
 {
-    UReportView *view = window_.GetReportDoc() != nullptr ? firstReportView(*window_.GetReportDoc()) : nullptr;
-    if (view != nullptr) {
-        view->UpdateData(true); // it was hidden while the report was written
-    }
-    return view;
+    return window_.GetReportDoc() != nullptr ? firstReportView(*window_.GetReportDoc()) : nullptr;
 }
 
 Command ReportWindowCommands::ofReport(unsigned id, void (ReportWindowCommands::*act)())
@@ -34,13 +30,23 @@ Command ReportWindowCommands::ofView(unsigned id, void (*act)(UReportView &))
 {
     return {id,
             [this, act] {
-                if (UReportView *view = loadedView()) {
-                    act(*view);
+                if (UReportView *shown = view()) {
+                    act(*shown);
                 }
             },
-            [this](CommandState &state) {
-                state.enabled = hasReport() && firstReportView(*window_.GetReportDoc()) != nullptr;
-            }};
+            [this](CommandState &state) { state.enabled = hasReport() && view() != nullptr; }};
+}
+
+Command ReportWindowCommands::ofLoadedView(unsigned id, void (*act)(UReportView &))
+{
+    Command command = ofView(id, act);
+    command.handler = [this, act] {
+        if (UReportView *shown = view()) {
+            shown->loadIfStale(); // it was hidden while the report was written
+            act(*shown);
+        }
+    };
+    return command;
 }
 
 void ReportWindowCommands::save()
@@ -63,7 +69,6 @@ void ReportWindowCommands::close()
 
 void ReportWindowCommands::updateText()
 {
-    loadedView();
     window_.GetReportDoc()->SaveText();
 }
 
@@ -78,11 +83,11 @@ std::vector<Command> ReportWindowCommands::makeCommands()
          [this](CommandState &state) { state.enabled = hasReport() && window_.GetReportDoc()->EnableCloseOption(); }},
         {updateTextCommand, [this] { updateText(); },
          [this](CommandState &state) { state.enabled = hasReport() && window_.GetReportDoc()->HasTextObj(); }},
-        ofView(filePrintCommand, print),
-        ofView(hostPrintCommand, print),
-        ofView(printDirectCommand, [](UReportView &view) { view.OnReportPrint(true); }),
-        ofView(printPreviewCommand, preview),
-        ofView(hostPrintPreviewCommand, preview),
+        ofLoadedView(filePrintCommand, print),
+        ofLoadedView(hostPrintCommand, print),
+        ofLoadedView(printDirectCommand, [](UReportView &view) { view.OnReportPrint(true); }),
+        ofLoadedView(printPreviewCommand, preview),
+        ofLoadedView(hostPrintPreviewCommand, preview),
         ofView(pageSetupCommand, [](UReportView &view) { view.OnPageSetup(); }),
         {copyCommand, [this] { window_.GetList()->CopyLine(); },
          [this](CommandState &state) {

@@ -22,8 +22,9 @@ private:
     std::vector<Command> makeCommands();
     Command ofReport(unsigned id, void (ReportWindowCommands::*act)());
     Command ofView(unsigned id, void (*act)(UReportView &));
+    Command ofLoadedView(unsigned id, void (*act)(UReportView &));
     bool hasReport() const;
-    UReportView *loadedView() const;
+    UReportView *view() const;
 
     void save();
     void saveAs();
