@@ -18,6 +18,7 @@ CReportToolBar::CReportToolBar(kareport::CommandTarget *owner, QWidget *parent) 
     for (const unsigned id : bar.commands) {
         addButton(id);
     }
+    CReportToolBar::showTips();
 }
 
 int CReportToolBar::GetDlgCtrlID() const
@@ -29,10 +30,6 @@ void CReportToolBar::addButton(unsigned id)
 {
     QAction *button = addAction(kareport::reportIcon(id), QString());
     button->setData(id);
-    QString tip;
-    OnUserToolTip(button, tip);
-    button->setText(tip);
-    button->setToolTip(tip);
     connect(button, &QAction::triggered, this, [this, id] {
         if (kareport::CommandTarget *asked = target()) {
             asked->runCommand(id);
@@ -40,7 +37,18 @@ void CReportToolBar::addButton(unsigned id)
     });
     // A person without a mouse reaches the buttons with the Tab key.
     widgetForAction(button)->setFocusPolicy(Qt::TabFocus);
-    widgetForAction(button)->setAccessibleName(tip);
+}
+
+void CReportToolBar::showTips()
+{
+    for (QAction *button : actions()) {
+        QString tip;
+        if (OnUserToolTip(button, tip)) {
+            button->setText(tip);
+            button->setToolTip(tip);
+            widgetForAction(button)->setAccessibleName(tip);
+        }
+    }
 }
 
 bool CReportToolBar::OnShowControlBarMenu(const QPoint & /*point*/) const
@@ -75,8 +83,18 @@ void CReportToolBar::contextMenuEvent(QContextMenuEvent *event)
     event->setAccepted(!OnShowControlBarMenu(event->pos()));
 }
 
+void CReportToolBar::changeEvent(QEvent *event)
+{
+    QToolBar::changeEvent(event);
+    if (event->type() == QEvent::LanguageChange) {
+        setWindowTitle(Xlate("Report"));
+        showTips();
+    }
+}
+
 void CReportToolBar::showEvent(QShowEvent *event)
 {
+    showTips(); // by whoever overrides them, too
     OnUpdateCmdUI(nullptr, true);
     QToolBar::showEvent(event);
 }

@@ -30,10 +30,12 @@ public:
     bool OnShowControlBarMenu(const QPoint &point) const;
     /// Brings the buttons up to date by the owner. The arguments are those of bars that ask the frame; they are not looked at.
     void OnUpdateCmdUI(UXTPMDIFrameWnd *frame, bool disableIfNoHandler);
-    /// Gives the tool tip of a button. @return true
-    bool OnUserToolTip(const QAction *button, QString &text) const;
+    /// Gives the tool tip of a button, which is asked for when the bar is shown and when the language changes. @return
+    /// false leaves the button the one that it has; here true
+    virtual bool OnUserToolTip(const QAction *button, QString &text) const;
 
 protected:
+    void changeEvent(QEvent *event) override;
     void contextMenuEvent(QContextMenuEvent *event) override;
     void showEvent(QShowEvent *event) override;
 
@@ -41,6 +43,7 @@ private:
     kareport::CommandTarget *target() const;
 
     void addButton(unsigned id);
+    void showTips();
 
     kareport::CommandTarget *owner_;
 };

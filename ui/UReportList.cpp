@@ -4,8 +4,10 @@
 #include "ReportResources.h"
 
 #include <QClipboard>
+#include <QCoreApplication>
 #include <QGuiApplication>
 #include <QKeyEvent>
+#include <QResizeEvent>
 #include <QScrollBar>
 
 #include <algorithm>
@@ -76,6 +78,9 @@ bool UReportList::Create(QWidget *parent, const QRect &rect, int id)
     id_ = id;
     isCreated_ = true;
     show();
+    // A list whose parent is not shown yet would be laid out only then.
+    QResizeEvent laidOut(size(), size());
+    QCoreApplication::sendEvent(this, &laidOut);
     contentRect_ = viewport()->rect();
     return true;
 }

@@ -2,6 +2,7 @@
 
 #include "AppMessageBox.h"
 #include "FileIdentity.h"
+#include "Folders.h"
 #include "PdfExport.h"
 #include "PdfFile.h"
 #include "ReplaceFile.h"
@@ -153,6 +154,7 @@ std::optional<QString> askOwnName(const SaveRequest &request,
     if (!path || report == nullptr || !isPdfName(*path) || !UReportDoc::IsReportAvailable(report)) {
         return path;
     }
+    SetLastOpenDir(*path, lastReportFolder);
     exportPdf(*report, *path);
     return std::nullopt;
 }

@@ -224,9 +224,13 @@ TEST(SaveAs, TheReportWindowExportsLikewise)
     UReportDoc *report = Desk::reports().front();
     auto *window = dynamic_cast<UReportWindowDlg *>(report->GetReportWindow());
     desk.typed = {folder.path("out.pdf")};
+    SetLastOpenDir(QDir::root().filePath(QStringLiteral("a.rep")), QStringLiteral("LastOpenDirectoryReport"));
     window->OnSave();
     EXPECT_TRUE(folder.bytesOf("out.pdf").startsWith("%PDF-"));
     EXPECT_TRUE(report->IsModified());
+    EXPECT_EQ(QDir(GetInitialOpenDir(QStringLiteral("LastOpenDirectoryReport"))),
+              QFileInfo(folder.path("out.pdf")).dir())
+        << "the next dialog begins there";
     desk.typed = {folder.path("out.rep")};
     window->OnSave();
     EXPECT_FALSE(report->IsModified());

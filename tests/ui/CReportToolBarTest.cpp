@@ -150,6 +150,56 @@ TEST(CReportToolBar, NamesAreInTheUsersLanguage)
     }
 }
 
+TEST(CReportToolBar, NamesFollowAChangeOfTheLanguage)
+{
+    Owner owner;
+    const CReportToolBar bar(&owner);
+    ASSERT_EQ(buttonOf(bar, 0)->toolTip(), QStringLiteral("Save"));
+    const auto change = [] {
+        QCoreApplication::processEvents();
+        QCoreApplication::sendPostedEvents();
+    };
+    {
+        const Translator translator;
+        change();
+        for (std::size_t i = 0; i < ids.size(); ++i) {
+            const QString expected = u'[' + QString::fromUtf8(names.at(i)) + u']';
+            EXPECT_EQ(buttonOf(bar, i)->toolTip(), expected);
+            EXPECT_EQ(buttonOf(bar, i)->accessibleName(), expected);
+        }
+        EXPECT_EQ(bar.windowTitle(), QStringLiteral("[Report]"));
+    }
+    change();
+    EXPECT_EQ(buttonOf(bar, 0)->toolTip(), QStringLiteral("Save")) << "and back";
+}
+
+/// A bar of a host that names one of its buttons in its own way.
+class NamingBar : public CReportToolBar
+{
+public:
+    using CReportToolBar::CReportToolBar;
+    bool OnUserToolTip(const QAction *button, QString &text) const override
+    {
+        if (button->data().toUInt() == ids[0]) {
+            text = QStringLiteral("Keep");
+            return true;
+        }
+        text = QStringLiteral("never shown");
+        return button->data().toUInt() == ids[1] && CReportToolBar::OnUserToolTip(button, text);
+    }
+};
+
+TEST(CReportToolBar, AHostMayNameTheButtons)
+{
+    Owner owner;
+    NamingBar bar(&owner);
+    bar.show();
+    EXPECT_EQ(buttonOf(bar, 0)->toolTip(), QStringLiteral("Keep"));
+    EXPECT_EQ(buttonOf(bar, 0)->accessibleName(), QStringLiteral("Keep"));
+    EXPECT_EQ(buttonOf(bar, 1)->toolTip(), QStringLiteral("View\\Edit Report"));
+    EXPECT_EQ(buttonOf(bar, 2)->toolTip(), QStringLiteral("Print")) << "left as it was";
+}
+
 TEST(CReportToolBar, ButtonsFollowTheOwnerAndNotTheFrame)
 {
     for (const bool disableIfNoHandler : {false, true}) {
@@ -235,6 +285,22 @@ TEST(CReportToolBar, WithoutAnOwnerItHasNothingToRun)
     }
     bar.OnUpdateCmdUI(nullptr, true);
     EXPECT_EQ(enabledIn(bar), (std::array<bool, 3>{}));
+}
+
+TEST(CReportToolBar, WithoutAnOwnerItFollowsItsParent)
+{
+    Frame parent;
+    parent.owner.enabled = {true, false, true};
+    auto *bar = new CReportToolBar(nullptr, &parent);
+    parent.show();
+    bar->show();
+    EXPECT_EQ(enabledIn(*bar), parent.owner.enabled);
+    parent.owner.enabled = {true, true, false};
+    bar->OnUpdateCmdUI(nullptr, true);
+    EXPECT_EQ(enabledIn(*bar), parent.owner.enabled);
+    buttonOf(*bar, 0)->click();
+    buttonOf(*bar, 1)->click();
+    EXPECT_EQ(parent.owner.runs, (std::array<int, 3>{1, 1, 0}));
 }
 
 /// The bar between two fields, in a window that has the keyboard.

@@ -46,6 +46,23 @@ protected:
     UReportList list;
 };
 
+TEST(UReportList, TheContentIsTheInsideAlsoBeforeItsParentIsShown)
+{
+    QWidget shown;
+    shown.show();
+    UReportList early;
+    UReportList late;
+    QWidget hidden;
+    ASSERT_TRUE(early.Create(&shown, QRect(10, 20, 200, 100), 11005));
+    ASSERT_TRUE(late.Create(&hidden, QRect(10, 20, 200, 100), 11005));
+    EXPECT_EQ(late.GetContentRect(), early.GetContentRect());
+    EXPECT_LT(late.GetContentRect().width(), 200);
+    hidden.show();
+    EXPECT_EQ(late.viewport()->rect(), late.GetContentRect()) << "as it is then";
+    early.setParent(nullptr);
+    late.setParent(nullptr);
+}
+
 TEST(UReportList, IsCreatedAsAChildWithASunkenEdge)
 {
     QWidget parent;
