@@ -3,6 +3,7 @@
 #include "CViewPane.h"
 #include "MemoryLasts.h"
 #include "ReportEntry.h"
+#include "ReportViews.h"
 #include "UReportDoc.h"
 
 namespace kareport
@@ -36,6 +37,9 @@ UReportDoc *openNewReport(const NewReport &report, bool show, CViewPane *pane, u
     });
     if (made == nullptr) {
         return nullptr;
+    }
+    if (CViewPane *own = pane == nullptr ? made->GetFrameWindow() : nullptr) {
+        noteOwnPane(*own, show);
     }
     if (!report.name.isNull()) {
         made->SetTitle(report.name);

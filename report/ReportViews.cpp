@@ -1,5 +1,6 @@
 #include "ReportViews.h"
 
+#include "CViewPane.h"
 #include "UView.h"
 
 #include <algorithm>
@@ -18,6 +19,42 @@ std::vector<UView *> reportViews(const UReportDoc &report)
     std::vector<UView *> views;
     std::copy_if(report.GetViews().begin(), report.GetViews().end(), std::back_inserter(views), showsReport);
     return views;
+}
+
+void noteOwnPane(const CViewPane &pane, bool shown)
+{
+    for (const auto &view : pane.GetViews()) {
+        if (auto *port = dynamic_cast<ReportViewPort *>(view.get())) {
+            port->setPane(shown ? ReportViewPort::Pane::OwnShown : ReportViewPort::Pane::OwnHidden);
+        }
+    }
+}
+
+void showReportPane(CViewPane &pane, bool show)
+{
+    // A pane that is hidden already was hidden by whoever did it.
+    const bool isChanged = pane.IsVisible() != show;
+    for (const auto &view : pane.GetViews()) {
+        auto *port = dynamic_cast<ReportViewPort *>(view.get());
+        if (isChanged && port != nullptr && port->pane() != ReportViewPort::Pane::OfHost) {
+            port->setPane(show ? ReportViewPort::Pane::OwnShown : ReportViewPort::Pane::OwnHidden);
+        }
+    }
+    pane.ShowPane(show);
+}
+
+void closeOwnHiddenPanes(const UReportDoc &report)
+{
+    for (const UView *view : reportViews(report)) {
+        if (std::find(report.GetViews().begin(), report.GetViews().end(), view) == report.GetViews().end()) {
+            continue; // it has gone with a pane that was closed before
+        }
+        const auto *port = dynamic_cast<const ReportViewPort *>(view);
+        CViewPane *pane = view->GetParentPane();
+        if (pane != nullptr && port->pane() == ReportViewPort::Pane::OwnHidden && !pane->IsVisible()) {
+            pane->ClosePane();
+        }
+    }
 }
 
 } // namespace kareport

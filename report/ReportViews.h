@@ -5,6 +5,7 @@
 
 #include <vector>
 
+class CViewPane;
 class UView;
 
 namespace kareport
@@ -14,5 +15,12 @@ namespace kareport
 bool showsReport(const UView *view);
 /// The views that show a report's text, in their order.
 std::vector<UView *> reportViews(const UReportDoc &report);
+
+/// Notes that the report has made a pane for itself. @param shown  whether it is shown as well
+void noteOwnPane(const CViewPane &pane, bool shown);
+/// Shows or hides a pane in which the report stands, and notes of one of its own that it did.
+void showReportPane(CViewPane &pane, bool show);
+/// Closes those of a report's own panes that it keeps hidden. What a host hides is the host's to close.
+void closeOwnHiddenPanes(const UReportDoc &report);
 
 } // namespace kareport

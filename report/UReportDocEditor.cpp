@@ -112,7 +112,7 @@ void UReportDoc::showFrame()
     // A pane that is open already is left alone: showing it again takes the focus from the view that is typed in.
     CViewPane *frame = GetFrameWindow();
     if (frame != nullptr && !closeDocument_ && !frame->IsVisible()) {
-        frame->ShowPane(true);
+        kareport::showReportPane(*frame, true);
     }
 }
 
@@ -125,7 +125,7 @@ void UReportDoc::openInEditor(const QString &editor)
     const QString file = saveForEditor(name);
     CViewPane *frame = GetFrameWindow();
     if (frame != nullptr && !closeDocument_) {
-        frame->ShowPane(false);
+        kareport::showReportPane(*frame, false);
     }
     if (IsConvertToOpenInWord(file, editor)) {
         ConvertAndOpenInWord();

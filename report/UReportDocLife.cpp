@@ -70,6 +70,7 @@ void UReportDoc::openOwnPane()
     if (UDocTemplate *reportTemplate = GetReportTemplate()) {
         if (CViewPane *pane = reportTemplate->CreateNewPane(this, nullptr, ownPaneStyle, nullptr)) {
             reportTemplate->InitialUpdatePane(pane, this, 1);
+            kareport::noteOwnPane(*pane, true);
         }
     }
 }

@@ -2,6 +2,7 @@
 
 #include "CViewPane.h"
 #include "RememberedView.h"
+#include "ReportViews.h"
 #include "ReportWindow.h"
 #include "TextFolding.h"
 
@@ -28,7 +29,7 @@ void UReportDoc::UpdateReportInfo(const QString &name, bool headerFlag, bool ext
 void UReportDoc::takeUp(const QString &name, bool headerFlag, bool externalEditor)
 {
     if (CViewPane *pane = GetFrameWindow()) {
-        pane->ShowPane(false);
+        kareport::showReportPane(*pane, false);
     }
     const kareport::RememberedView activeView = kareport::RememberedView::active();
     SetHeaderFlag(headerFlag);

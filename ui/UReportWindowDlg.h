@@ -70,7 +70,7 @@ public:
 
     // --- Content ----------------------------------------------------------------------------------------------------
 
-    /// Links the report that the window shows, which may be null; the list gets its font.
+    /// Links the report that the window shows, which may be null. The list gets its font, so that its columns align.
     void SetReportDoc(UReportDoc *report);
     /// The report; null when there is none or it has gone.
     UReportDoc *GetReportDoc() const;

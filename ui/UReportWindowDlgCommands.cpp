@@ -4,12 +4,11 @@
 #include "CViewPane.h"
 #include "ReportEntry.h"
 #include "ReportSaveName.h"
+#include "ReportViews.h"
 #include "UDocTemplate.h"
 #include "UReportDoc.h"
 #include "UReportView.h"
 #include "Xlate.h"
-
-#include <algorithm>
 
 UReportView *kareport::firstReportView(const UReportDoc &report)
 {
@@ -20,26 +19,6 @@ UReportView *kareport::firstReportView(const UReportDoc &report)
     }
     return nullptr;
 }
-
-namespace
-{
-
-/// Closes the panes of a report that were never shown: it now stands in one that is.
-void closeHiddenPanes(const UReportDoc &report, const CViewPane *shown)
-{
-    const std::vector<UView *> views = report.GetViews();
-    for (const UView *view : views) {
-        if (std::find(report.GetViews().begin(), report.GetViews().end(), view) == report.GetViews().end()) {
-            continue; // it has gone with a pane that was closed before
-        }
-        CViewPane *pane = view->GetParentPane();
-        if (pane != nullptr && pane != shown && !pane->IsVisible()) {
-            pane->ClosePane();
-        }
-    }
-}
-
-} // namespace
 
 void UReportWindowDlg::OnUpdateSave(kareport::CommandState &state)
 {
@@ -104,6 +83,7 @@ void UReportWindowDlg::OnPrint()
     }
     if (CViewPane *pane = reportTemplate->CreateNewPane(report, nullptr, UReportDoc::ownPaneStyle, nullptr)) {
         reportTemplate->InitialUpdatePane(pane, report, 0);
+        kareport::noteOwnPane(*pane, false);
     }
     report->UpdateAllViews(nullptr, 0, nullptr);
     // Views that are updated, and the user who prints, may close the report, and this window with it.
@@ -131,7 +111,8 @@ void UReportWindowDlg::ShowReport()
         }
         if (CViewPane *pane = reportTemplate->CreateNewPane(report, nullptr, UReportDoc::ownPaneStyle, nullptr)) {
             reportTemplate->InitialUpdatePane(pane, report, 1);
-            closeHiddenPanes(*report, pane);
+            kareport::noteOwnPane(*pane, true);
+            kareport::closeOwnHiddenPanes(*report); // the report now stands in one that is shown
         }
     }
     report->UpdateAllViews(nullptr, 0, nullptr);

@@ -128,9 +128,15 @@ TEST_F(ReportWindowCommands, ACancelledDialogChangesNothing)
 
 TEST_F(ReportWindowCommands, ASaveThatFailsLeavesTheReportModified)
 {
-    const AnsweredSaving saving(folder.filePath(QStringLiteral("missing/a.rep")));
+    const QString path = folder.filePath(QStringLiteral("missing/a.rep"));
+    const AnsweredSaving saving(path);
+    const AnsweredBoxes boxes(MessageAnswer::Ok);
     window.OnSave();
     EXPECT_TRUE(report->IsModified());
+    ASSERT_EQ(boxes.boxes.size(), 1U) << "and says why";
+    EXPECT_TRUE(boxes.boxes[0].text.startsWith(u'"' + path + u'"')) << boxes.boxes[0].text.toStdString();
+    EXPECT_TRUE(boxes.boxes[0].text.contains(QStringLiteral("No such file or directory")))
+        << boxes.boxes[0].text.toStdString();
 }
 
 TEST_F(ReportWindowCommands, TheReportMayBeClosedWhileTheDialogIsOpen)

@@ -24,10 +24,48 @@ TEST_F(ReportWindowShow, ShowingOpensTheReportInAViewOfItsOwn)
     auto *view = dynamic_cast<UReportView *>(report->GetViews().back());
     ASSERT_NE(view, nullptr);
     EXPECT_TRUE(view->GetParentPane()->IsVisible());
+    EXPECT_EQ(view->GetParentPane()->GetStyle(), 4096U);
+    EXPECT_FALSE(view->GetParentPane()->GetRect().has_value()) << "where the frame puts it";
     EXPECT_EQ(view->GetEdit().toPlainText(), QStringLiteral("  first\nsecond\n"));
     EXPECT_EQ(activeView(), view) << "what came to the front last";
     EXPECT_TRUE(view->GetEdit().hasFocus());
     EXPECT_TRUE(report->IsModified());
+}
+
+TEST_F(ReportWindowShow, APaneThatTheHostHidesStays)
+{
+    CViewPane *host = GetReportTemplate()->CreateNewPane(report, nullptr, 0, nullptr);
+    GetReportTemplate()->InitialUpdatePane(host, report, 0);
+    CViewPane *own = report->GetFrameWindow();
+    window.ShowReport();
+    EXPECT_TRUE(CViewPane::IsOpen(host)) << "which the host has not shown yet";
+    EXPECT_FALSE(CViewPane::IsOpen(own)) << "the report's own hidden one has given way";
+    EXPECT_EQ(report->GetViews().size(), 2U);
+}
+
+TEST_F(ReportWindowShow, APaneThatTheHostHasShownAndHiddenStays)
+{
+    CViewPane *own = report->GetFrameWindow();
+    own->ShowPane(true);
+    own->ShowPane(false);
+    window.ShowReport();
+    EXPECT_TRUE(CViewPane::IsOpen(own));
+}
+
+TEST_F(ReportWindowShow, EveryRunLeavesOnePane)
+{
+    const AnsweredPrinting printing;
+    for (int run = 0; run < 3; ++run) {
+        window.ShowReport();
+        ASSERT_EQ(report->GetViews().size(), 1U) << run;
+        EXPECT_TRUE(report->GetFrameWindow()->IsVisible()) << run;
+        report->UpdateReportInfo(QStringLiteral("Traverse"), false, false);
+        ASSERT_FALSE(report->GetFrameWindow()->IsVisible()) << run << ": the next run has hidden it";
+        window.OnPrint();
+        ASSERT_EQ(report->GetViews().size(), 2U) << run;
+        ASSERT_TRUE(window.createDocked(QStringLiteral("Traverse"), nullptr));
+        report->UpdateReportInfo(QStringLiteral("Traverse"), false, false);
+    }
 }
 
 TEST_F(ReportWindowShow, AReportForTheUsersEditorOpensNoView)
@@ -43,7 +81,12 @@ TEST_F(ReportWindowShow, AReportForTheUsersEditorOpensNoView)
     UReportDoc *edited = CreateReportWindow(QStringLiteral("Edited"), false, true);
     edited->WriteLine(QStringLiteral("text"), 0, 1, 0);
     UReportWindowDlg &editedWindow = WindowDesk::windowOf(edited);
+    UView *previous = editedWindow.GetPreviousView();
+    ASSERT_NE(previous, nullptr);
+    desk.openReport(QStringLiteral("In front"));
+    ASSERT_NE(activeView(), previous);
     editedWindow.ShowReport();
+    EXPECT_EQ(activeView(), previous) << "the view that was active before has the keyboard again";
     ASSERT_EQ(launches.all.size(), 1U);
     EXPECT_EQ(launches.all.front().program, editor.path);
     EXPECT_NE(contentOf(launches.all.front().file).find("text"), std::string::npos);
@@ -91,7 +134,10 @@ TEST_F(ReportWindowShow, PrintingOpensAHiddenViewAndPrints)
     EXPECT_EQ(printing.prints, 1);
     EXPECT_EQ(printing.printedPages(), 1);
     ASSERT_EQ(report->GetViews().size(), 2U);
-    EXPECT_FALSE(report->GetViews().back()->GetParentPane()->IsVisible()) << "the view that was made for it";
+    const CViewPane &made = *report->GetViews().back()->GetParentPane();
+    EXPECT_FALSE(made.IsVisible()) << "the view that was made for it";
+    EXPECT_EQ(made.GetStyle(), 4096U);
+    EXPECT_FALSE(made.GetRect().has_value());
     EXPECT_EQ(activeView(), report->GetViews().front()) << "its views were updated, which shows its own pane";
     EXPECT_EQ(dynamic_cast<UReportView *>(report->GetViews().front())->GetEdit().toPlainText(),
               QStringLiteral("  first\nsecond\n"))
@@ -116,21 +162,29 @@ TEST_F(ReportWindowShow, WithoutATemplateTheWindowClosesAndNothingMore)
 {
     const AnsweredPrinting printing;
     report->SetExternalEditorFlag(true);
+    UView *previous = before->GetViews().front();
+    ASSERT_EQ(window.GetPreviousView(), previous);
+    const UReportDoc *other = desk.openReport(QStringLiteral("In front"));
+    ASSERT_NE(activeView(), previous);
     {
         const UApplication hidesTheTemplate;
         window.OnPrint();
     }
     EXPECT_FALSE(window.isCreated());
+    EXPECT_EQ(activeView(), previous) << "the view that was active before has the keyboard again";
     EXPECT_FALSE(report->GetExternalEditorFlag()) << "left cleared";
     EXPECT_EQ(printing.prints, 0);
     EXPECT_EQ(report->GetViews().size(), 1U);
 
-    ASSERT_TRUE(window.createDocked(QStringLiteral("Traverse"), nullptr));
+    ASSERT_TRUE(window.createDocked(QStringLiteral("Traverse"), previous));
+    other->GetFrameWindow()->BringToTop();
+    ASSERT_NE(activeView(), previous);
     {
         const UApplication hidesTheTemplate;
         window.ShowReport();
     }
     EXPECT_FALSE(window.isCreated());
+    EXPECT_EQ(activeView(), previous);
     EXPECT_EQ(report->GetViews().size(), 1U);
 }
 

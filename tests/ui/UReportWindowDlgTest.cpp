@@ -3,6 +3,8 @@
 #include "ReportContent.h"
 #include "XInput.h"
 
+#include <QTranslator>
+
 #include <gtest/gtest.h>
 
 namespace
@@ -51,6 +53,34 @@ TEST_F(ReportWindow, IsCreatedAtTheBottomOfTheFrame)
     const auto *pane = dynamic_cast<COneViewPane *>(report->GetFrameWindow());
     EXPECT_GT(pane->GetDock()->height(), window.GetDock()->height()) << "the documents keep the greater part";
     EXPECT_NEAR(window.GetDock()->height(), window.GetDock()->sizeHint().height(), 40);
+}
+
+/// Gives every text back in brackets.
+class Translator : public QTranslator
+{
+public:
+    Translator() { QCoreApplication::installTranslator(this); }
+    ~Translator() override { QCoreApplication::removeTranslator(this); }
+
+    QString translate(const char * /*context*/, const char *text, const char * /*note*/, int /*number*/) const override
+    {
+        return u'[' + QString::fromUtf8(text) + u']';
+    }
+    bool isEmpty() const override { return false; }
+};
+
+TEST_F(ReportWindow, ItsTextsAreTranslatedWhenItIsPrepared)
+{
+    ASSERT_TRUE(create());
+    window.setActive(true);
+    ASSERT_EQ(window.GetList()->accessibleName(), QStringLiteral("Report lines"));
+    const Translator translator;
+    EXPECT_EQ(window.HandleInitDialog(), 0);
+    EXPECT_FALSE(window.IsActive());
+    EXPECT_EQ(window.GetList()->accessibleName(), QStringLiteral("[Report lines]"));
+    WindowDesk::settle();
+    const CReportToolBar *bar = window.GetToolBar();
+    EXPECT_EQ(bar->actions().front()->toolTip(), QStringLiteral("[Save]"));
 }
 
 TEST_F(ReportWindow, IsCreatedOnce)
