@@ -2,6 +2,7 @@
 
 #include <QFile>
 
+#include <algorithm>
 #include <csignal>
 #include <sys/resource.h>
 #include <unistd.h>
@@ -41,6 +42,15 @@ int endEditors(const QDir &folder)
         editors.remove(name);
     }
     return ended;
+}
+
+bool isEditorOpen(const QDir &folder)
+{
+    const QStringList processes = QDir(folder.filePath(QStringLiteral("editors"))).entryList(QDir::Files);
+    return std::any_of(processes.begin(), processes.end(), [](const QString &name) {
+        const auto process = static_cast<pid_t>(name.toInt());
+        return process > 1 && ::kill(process, 0) == 0;
+    });
 }
 
 } // namespace monkey

@@ -98,12 +98,20 @@ private:
     /// Files that were written since the step began.
     QStringList writtenFiles() const;
     bool isKept(const QString &text) const;
+    /// Whether the user let the desk load the file of a report again.
+    bool isReloaded(const Seen &was) const;
+    static bool isRich(const UReportDoc &report);
+    static QString checkPdf(const UReportDoc &report);
+    static QString checkPrint(UReportView &view);
 
-    QString checkWindows() const;
-    QString checkActive() const;
-    QString checkTexts() const;
     QString checkClosed() const;
-    QString checkPages() const;
+    QString checkTexts() const;
+    QString checkFiles() const;
+    QString checkWindows();
+    QString checkActive() const;
+    QString checkPages();
+    /// How the panes stand, for whoever reads the log.
+    QString describePanes() const;
 
     QDir folder_;
     std::unique_ptr<Application> application_;
@@ -127,5 +135,7 @@ void limitFiles(qint64 bytes);
 qint64 fileLimit();
 /// Ends the editors that this desk has started. @return their number
 int endEditors(const QDir &folder);
+/// Whether one of them is open.
+bool isEditorOpen(const QDir &folder);
 
 } // namespace monkey

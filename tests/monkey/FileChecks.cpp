@@ -1,0 +1,86 @@
+#include "World.h"
+
+#include "ReportTextDecoder.h"
+#include "RichTextReader.h"
+#include "UReportDoc.h"
+
+#include <QFile>
+#include <QFileInfo>
+#include <QTextDocument>
+
+#include <algorithm>
+
+namespace monkey
+{
+
+namespace
+{
+
+/// The characters of a text, whatever ends its lines.
+QString plainLines(QString text)
+{
+    text.replace(QStringLiteral("\r\n"), QStringLiteral("\n")).replace(u'\r', u'\n').replace(QChar(0xA0), u' ');
+    while (text.endsWith(u'\n')) {
+        text.chop(1);
+    }
+    return text;
+}
+
+/// What is seen of a rich text; null where it is none.
+QString seenOf(QByteArrayView rich)
+{
+    QTextDocument document;
+    return rich.startsWith("{\\rtf") && !kareport::readRichText(rich, document) ? plainLines(document.toPlainText())
+                                                                                : QString();
+}
+
+/// Whether a file holds a text, as whoever opens it reads it.
+bool loadsAs(const QString &path, const QString &text)
+{
+    QFile file(path);
+    if (!file.open(QIODevice::ReadOnly)) {
+        return false;
+    }
+    const QByteArray content = file.readAll();
+    QString kept;
+    if (!kareport::decodeReportText(content, kept) && kept == text) {
+        return true;
+    }
+    const QString rich = seenOf(text.toLatin1());
+    return content.startsWith("{\\rtf") && seenOf(content) == (rich.isNull() ? plainLines(text) : rich);
+}
+
+} // namespace
+
+QStringList World::writtenFiles() const
+{
+    QStringList written;
+    const QHash<QString, Stamp> now = lookAtFiles();
+    for (auto file = now.begin(); file != now.end(); ++file) {
+        if (filesBefore_.value(file.key()) != file.value()) {
+            written.append(file.key());
+        }
+    }
+    return written;
+}
+
+bool World::isKept(const QString &text) const
+{
+    const QStringList written = writtenFiles();
+    return std::any_of(written.begin(), written.end(), [&text](const QString &path) { return loadsAs(path, text); });
+}
+
+QString World::checkFiles() const
+{
+    for (const UReportDoc *report : reports()) {
+        const Seen *was = seen(ids_.value(report));
+        const bool isSaved = was != nullptr && was->isModified && !report->IsModified() && !isReloaded(*was);
+        const QString text = textOf(*report);
+        if (isSaved && !text.isEmpty() && !isKept(text)) {
+            return QStringLiteral("%1 counts as saved and is in no file").arg(was->title);
+        }
+    }
+    return {};
+}
+
+} // namespace monkey
