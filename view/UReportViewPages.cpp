@@ -173,14 +173,15 @@ void UReportView::takeText()
     UReportDoc &report = *GetDocument();
     const QString text = edit_->windowText(); // all of it has been loaded then
     const QTextDocument &document = *edit_->document();
+    const bool isKnown = !isStale();
     std::vector<qint64> starts;
-    if (!isStale()) {
+    if (isKnown) {
         for (const int line : pageStartLines()) {
             starts.push_back(kareport::startOfBlock(document.findBlockByNumber(line)));
         }
     }
     report.SetData(text);
-    if (!starts.empty()) {
+    if (isKnown) {
         report.SetPageStarts(std::move(starts));
     }
     noteTaken();

@@ -151,6 +151,10 @@ TEST(DocumentAndViewsRandom, SequencesThatWereFound)
           {ReportOp::Cut, 223, 4640, 216},
           {ReportOp::Undo, 390, 2592, 345}},
          "a header line that begins no page, cut and brought back"},
+        {{{ReportOp::TypeOver, 877, 1652, 272, 1},
+          {ReportOp::WriteLine, 539, 2722, 175, 1},
+          {ReportOp::TakeAll, 946, 1662, 70, 1}},
+         "a page that began within a line is none when the text is taken whole, though the line reads like a header"},
     };
     for (const Row &row : rows) {
         EXPECT_EQ(play(row.steps).toStdString(), "") << row.reason;
