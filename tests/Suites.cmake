@@ -1,4 +1,5 @@
-# Adds a test for each suite of a test program. ctest reads this when it is started, with `program`, `folder` and `cache` set.
+# Adds a test for each suite of a test program. ctest reads this when it is started, with `program`, `folder`, `cache` and
+# `heavy`, the suites that start a heavy program of other people, set.
 if(NOT EXISTS "${program}")
     add_test("${folder}.NOT_BUILT" "${program}")
     return()
@@ -20,5 +21,10 @@ endif()
 file(READ "${cache}" suites)
 foreach(suite IN LISTS suites)
     add_test("${folder}.${suite}" "${program}" "--gtest_filter=${suite}.*")
-    set_tests_properties("${folder}.${suite}" PROPERTIES TIMEOUT 600 LABELS "${folder}")
+    set(labels "${folder}")
+    list(FIND heavy "${suite}" at) # no IN_LIST: ctest sets no policies
+    if(NOT at EQUAL -1)
+        list(APPEND labels heavy)
+    endif()
+    set_tests_properties("${folder}.${suite}" PROPERTIES TIMEOUT 600 LABELS "${labels}")
 endforeach()
