@@ -5,4 +5,4 @@ cd "$(dirname "$0")/.."
 
 mode=(--dry-run -Werror)
 [ "${1:-}" = --fix ] && mode=(-i)
-find host templates page formats report print view ui sources jobs apps tests bench fuzz tools examples -name '*.h' -o -name '*.cpp' | xargs clang-format "${mode[@]}"
+find host templates page formats report print view ui geometry sources jobs apps tests bench fuzz tools examples -name '*.h' -o -name '*.cpp' | xargs clang-format "${mode[@]}"

@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # Installs the Debian packages that a task needs and that are not there yet.
 #
-#   scripts/packages.sh build|test|docs|package|office|bench|compare|tidy|coverage [...]
+#   scripts/packages.sh build|test|docs|package|office|bench|compare|tidy|coverage|tables [...]
 #
 # Every package stands here once, with the reason for it. Nothing is asked of apt when all are installed.
 set -euo pipefail
@@ -62,6 +62,10 @@ packages_tidy=(
 )
 packages_coverage=(
     gcovr
+)
+
+packages_tables=(
+    python3-mpmath          # arbitrary precision, for the expected values of the geometry's tests
 )
 
 wanted=()

@@ -1,0 +1,35 @@
+#include "Alignment.h"
+
+#include <algorithm>
+
+namespace kareport
+{
+
+void Alignment::add(const PlaneCurve &curve, double length)
+{
+    elements_.push_back({curve, length, length_, curve.at(curve.length() / 2).point});
+    length_ += length;
+}
+
+std::size_t Alignment::elementAt(double distance) const
+{
+    const auto next = std::upper_bound(elements_.begin(), elements_.end(), distance,
+                                       [](double at, const Element &element) { return at < element.start; });
+    return next == elements_.begin() ? 0 : static_cast<std::size_t>(next - elements_.begin()) - 1;
+}
+
+std::optional<CurvePlace> Alignment::at(double distance, bool before) const
+{
+    constexpr double rounding = 1e-7;
+    if (elements_.empty() || !(distance >= -rounding && distance <= length_ + rounding)) {
+        return std::nullopt;
+    }
+    std::size_t index = elementAt(distance);
+    if (before && index > 0 && distance <= elements_[index].start) {
+        --index;
+    }
+    const Element &element = elements_[index];
+    return element.curve.at((distance - element.start) * (element.curve.length() / element.length));
+}
+
+} // namespace kareport

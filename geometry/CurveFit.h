@@ -1,0 +1,36 @@
+#pragma once
+
+#include "PlaneCurve.h"
+
+#include <optional>
+#include <variant>
+
+namespace kareport
+{
+
+using FittedCurve = std::variant<PlaneCurve, CurveFault>;
+
+/// The line between two points.
+FittedCurve lineBetween(PlanePoint start, PlanePoint end);
+
+/// The arc about a centre that begins at `start` and goes on, to the right or to the left, to the direction of `end`.
+/// A start that is the end as well makes a full circle.
+FittedCurve arcAbout(PlanePoint centre, PlanePoint start, PlanePoint end, bool isRight);
+/// The arc about a centre of a length.
+FittedCurve arcAbout(PlanePoint centre, PlanePoint start, double length, bool isRight);
+/// The centre of an arc of a radius between two points, which lies to the right or to the left of the way from start to
+/// end. Nothing when the points are the same, or too far from each other for the radius.
+/// @param isLong  the arc is longer than half a circle: its centre is then on the other side of the chord
+std::optional<PlanePoint> centreOfArc(PlanePoint start, PlanePoint end, double radius, bool isRight, bool isLong);
+
+/// A curve of a length and of curvatures at its ends, laid so that it begins at `start` and its chord leads towards `end`.
+/// It ends at `end` when the measures fit the points; how far it does not is seen by its end.
+FittedCurve curveTowards(TransitionForm form, PlanePoint start, PlanePoint end, double length, double startCurvature,
+                         double endCurvature);
+
+/// Where the tangents of both ends meet; nothing when they are parallel.
+std::optional<PlanePoint> tangentIntersection(const PlaneCurve &curve);
+/// The centre of an arc; nothing for other curves.
+std::optional<PlanePoint> centreOf(const PlaneCurve &curve);
+
+} // namespace kareport
