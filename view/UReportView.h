@@ -127,8 +127,9 @@ private:
     std::vector<int> pageStartLines() const;
     /// The same by the document's record, in a control of so many lines; nothing where the control shows another text.
     std::optional<std::vector<int>> recordedStartLines(int lineCount) const;
-    /// Where pages begin in the control's text after an edit that the document has not taken over yet.
-    std::vector<qint64> startsAfter(const kareport::ReportChange &change) const;
+    /// Where pages begin in the control's text after an edit that the document has not taken over yet; nothing where the
+    /// control shows another text.
+    std::optional<std::vector<qint64>> startsAfter(const kareport::ReportChange &change) const;
     void forgetPages();
     void followPages(const kareport::ReportChange &change);
     bool carryThrough(const kareport::ReportChange &change);

@@ -119,11 +119,11 @@ bool UReportView::carryThrough(const ReportChange &change)
     return report.ReplaceText(at, change.documentRemoved(), inserted);
 }
 
-std::vector<qint64> UReportView::startsAfter(const ReportChange &change) const
+std::optional<std::vector<qint64>> UReportView::startsAfter(const ReportChange &change) const
 {
     const auto lines = isStale() ? std::nullopt : recordedStartLines(change.lineEndsInAll + 1);
     if (!lines) {
-        return {}; // the headers in the text are all that is known
+        return std::nullopt; // the headers in the text are all that is known
     }
     const QTextDocument &document = *edit_->document();
     const QString inserted = change.documentInserted();
@@ -161,10 +161,10 @@ void UReportView::takeChanged(const ReportChange &change)
     if (carryThrough(change)) {
         return;
     }
-    std::vector<qint64> starts = startsAfter(change);
+    std::optional<std::vector<qint64>> starts = startsAfter(change);
     GetDocument()->SetData(edit_->windowText());
-    if (!starts.empty()) {
-        GetDocument()->SetPageStarts(std::move(starts));
+    if (starts) { // also none: a header line that begins no page is an ordinary line
+        GetDocument()->SetPageStarts(std::move(*starts));
     }
 }
 
@@ -181,7 +181,7 @@ void UReportView::takeText()
         }
     }
     report.SetData(text);
-    if (isKnown) {
+    if (isKnown) { // also none: a header line that begins no page is an ordinary line
         report.SetPageStarts(std::move(starts));
     }
     noteTaken();

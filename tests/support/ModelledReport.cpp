@@ -1,6 +1,7 @@
 #include "ModelledReport.h"
 
-ModelledReport::ModelledReport(QString &clipboard) : model_(headerOf(QString(), 0).chopped(3)), clip_(clipboard)
+ModelledReport::ModelledReport(QString &clipboard)
+    : template_(shown_.report), model_(headerOf(QStringLiteral("Title"), 0).chopped(3)), clip_(clipboard)
 {
     shown_.report.FixPage(9, 80);
     model_.setLinesPerPage(9);
@@ -106,7 +107,7 @@ void ModelledReport::actAsHost(const ReportStep &step)
         isModified_ = isModified_ || model_.size() > before || (isNew && report().GetHeaderFlag());
         break;
     }
-    case ReportOp::Table:
+    case ReportOp::Rows:
         for (int i = 0; i < step.a % 15; ++i) {
             const QString row = QStringLiteral("%1  %2").arg(i, 4).arg(i * 1.25);
             report().WriteLine(row, 0, 1, 0);
@@ -114,6 +115,15 @@ void ModelledReport::actAsHost(const ReportStep &step)
             isModified_ = true;
         }
         break;
+    case ReportOp::Table:
+    case ReportOp::Block: {
+        const qint64 before = model_.size();
+        const bool isWritten =
+            step.op == ReportOp::Table ? template_.writeTable(model_, step) : template_.writeBlock(model_, step);
+        wrongAnswer_ = wrongAnswer_ || !isWritten;
+        isModified_ = isModified_ || model_.size() > before;
+        break;
+    }
     case ReportOp::Heading: {
         const QString heading = line(step.c % 7);
         report().SetHeading(heading, step.a % 3, step.b % 3);

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "EditSpy.h"
+#include "ModelledTemplate.h"
 #include "ReportModel.h"
 #include "ReportSteps.h"
 #include "SavedReports.h"
@@ -82,6 +83,7 @@ private:
     QString compareViews(const QString &text);
 
     ShownReport shown_;
+    ModelledTemplate template_;
     ReportModel model_;
     std::vector<Shown> views_;
     QTemporaryDir folder_;

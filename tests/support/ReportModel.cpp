@@ -83,15 +83,60 @@ bool ReportModel::newPage(int needed)
 
 void ReportModel::writeLine(const QString &text, int before, int after)
 {
-    if (!newPage(before)) {
-        lineFeed(before);
-    }
+    skipLines(before);
     write(text);
     if (after != 0) {
         lineFeed(1);
-        if (!newPage(after - 1)) {
-            lineFeed(after - 1);
+        skipLines(after - 1);
+    }
+}
+
+void ReportModel::writeTable(const ModelTable &table)
+{
+    skipLines(table.before);
+    setHeading(table.heading, 0, table.headingAfter);
+    if (!heading_.isEmpty()) {
+        constexpr int room = 3; // a heading and one row
+        if (lineCount_ == 0 || linesPerPage_ - lineNumber_ <= room) {
+            newPage(-1); // its header brings the heading
+        } else {
+            if (!table.name.isEmpty()) {
+                lineFeed(1);
+                writeLine(table.name, 0, 1);
+                lineFeed(1);
+            }
+            writeHeading();
         }
+    }
+    for (int i = 0; i < table.rows.size(); ++i) {
+        const bool isLast = i + 1 == table.rows.size();
+        if (!isLast) {
+            writeLine(table.rows[i], 0, 1);
+            continue;
+        }
+        newPage(0);
+        write(table.rows[i]);
+        endHeading(); // a page that the end of the last row begins has none
+        writeLine(QString(), 0, 1);
+    }
+    endHeading();
+    skipLines(table.after);
+}
+
+void ReportModel::writeBlock(const QStringList &lines, int before, int after)
+{
+    skipLines(before);
+    for (const QString &line : lines) {
+        writeLine(line, 0, 1);
+    }
+    endHeading();
+    skipLines(after);
+}
+
+void ReportModel::skipLines(int count)
+{
+    if (!newPage(count)) {
+        lineFeed(count);
     }
 }
 

@@ -9,6 +9,17 @@
 #include <algorithm>
 #include <vector>
 
+/// A table of data, laid out.
+struct ModelTable
+{
+    QString name; ///< stands over the heading; empty for none
+    QString heading;
+    QStringList rows;
+    int before = 0;
+    int after = 0;
+    int headingAfter = 0;
+};
+
 /// A report as its rules say, as plainly as can be: every character knows whether a page begins at it. What it is compared
 /// with is faster.
 class ReportModel
@@ -32,6 +43,8 @@ public:
     void writeHeading();
     bool newPage(int needed);
     void writeLine(const QString &text, int before, int after);
+    void writeTable(const ModelTable &table);
+    void writeBlock(const QStringList &lines, int before, int after);
     /// The report has been read back from its file.
     void reload(const QString &text);
     /// The view has put the same text with other line ends in the place of this one.
@@ -68,6 +81,8 @@ private:
     };
 
     void setText(const QString &text);
+    void skipLines(int count);
+    void endHeading() { setHeading(QString(), 0, 2); }
     static bool isHeader(const QString &line);
     bool beginsLine(qint64 at) const { return at == 0 || cells_[static_cast<std::size_t>(at - 1)].character == u'\n'; }
     static std::vector<qint64> headersIn(const QString &text);
