@@ -26,12 +26,23 @@ QString plainLines(QString text)
     return text;
 }
 
-/// What is seen of a rich text; null where it is none.
-QString seenOf(QByteArrayView rich)
+/// What is seen of a rich text, as far as it can be read.
+template <typename View>
+QString seenOf(View rich)
 {
     QTextDocument document;
-    return rich.startsWith("{\\rtf") && !kareport::readRichText(rich, document) ? plainLines(document.toPlainText())
-                                                                                : QString();
+    kareport::readRichText(rich, document);
+    return plainLines(document.toPlainText());
+}
+
+/// Whether a rich text shows what a report shows: the report's text, read as characters or as the bytes of a file, or as it
+/// stands.
+bool showsSame(const QByteArray &rich, const QString &text)
+{
+    const QString seen = seenOf(QByteArrayView(rich));
+    return kareport::isRichText(text)
+               ? seen == seenOf(QStringView(text)) || seen == seenOf(QByteArrayView(text.toLatin1()))
+               : seen == plainLines(text);
 }
 
 /// Whether a file holds a text, as whoever opens it reads it.
@@ -46,8 +57,7 @@ bool loadsAs(const QString &path, const QString &text)
     if (!kareport::decodeReportText(content, kept) && kept == text) {
         return true;
     }
-    const QString rich = seenOf(text.toLatin1());
-    return content.startsWith("{\\rtf") && seenOf(content) == (rich.isNull() ? plainLines(text) : rich);
+    return kareport::isRichText(QByteArrayView(content)) && showsSame(content, text);
 }
 
 } // namespace

@@ -102,14 +102,14 @@ private:
     bool isReloaded(const Seen &was) const;
     static bool isRich(const UReportDoc &report);
     static QString checkPdf(const UReportDoc &report);
-    static QString checkPrint(UReportView &view);
+    QString checkPrint(UReportView &view) const;
 
     QString checkClosed() const;
     QString checkTexts() const;
     QString checkFiles() const;
     QString checkWindows();
     QString checkActive() const;
-    QString checkPages();
+    QString checkPages() const;
     /// How the panes stand, for whoever reads the log.
     QString describePanes() const;
 
