@@ -175,6 +175,23 @@ TEST(UReportViewEditPages, APastedHeaderBeginsAPageWithTheFirstEditAlready)
     }
 }
 
+TEST(UReportViewEditPages, AHeaderLineThatBeginsNoPageIsAnOrdinaryLineAlsoAfterTheFirstEdit)
+{
+    for (const Kind &kind : kinds()) {
+        ShownReport t;
+        t.report.SetRTFDataFlag(kind.isImage);
+        t.report.WriteLine(kind.secondLine, 0, 1, 0);
+        t.report.WriteLine(headerOf(QString(), 7), 0, 1, 0);
+        t.report.SetPageStarts({});
+        UReportView &view = t.open();
+        putCursor(view.GetEdit(), 0);
+        QTest::keyClick(&view.GetEdit(), Qt::Key_X);
+        EXPECT_TRUE(t.report.GetPageStarts().empty()) << kind.name;
+        view.OnChange();
+        EXPECT_TRUE(t.report.GetPageStarts().empty()) << kind.name << ", taken as a whole";
+    }
+}
+
 TEST(UReportViewEditPages, AViewThatIsBehindItsReportKnowsNoPages)
 {
     ShownReport t;
