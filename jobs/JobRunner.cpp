@@ -5,8 +5,10 @@
 #include "Interrupt.h"
 #include "JsonObjectList.h"
 #include "ReportEntry.h"
+#include "ReportTextCodec.h"
 #include "TemplateCheck.h"
 #include "TemplateSource.h"
+#include "UXmlReportTpl.h"
 #include "Xlate.h"
 
 #include <QFileInfo>

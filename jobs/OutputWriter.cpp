@@ -5,6 +5,8 @@
 #include "ProcessSetup.h"
 #include "ReplaceFile.h"
 #include "ReportContent.h"
+#include "ReportGuards.h"
+#include "ReportTextCodec.h"
 #include "RichTextWriter.h"
 #include "SizeLimit.h"
 #include "Xlate.h"
@@ -94,13 +96,14 @@ private:
 
     bool writeRichTextTo(QIODevice &device)
     {
-        // What this writes must not hang on another output that wants the report in rich-text mode.
-        const bool isImageOn = report_.GetRTFDataFlag();
-        report_.SetRTFDataFlag(false);
         QTextDocument document;
         RichTextNotes notes;
-        const auto error = showReportContent(report_, document, &notes);
-        report_.SetRTFDataFlag(isImageOn);
+        std::optional<RichTextError> error;
+        {
+            // What this writes must not hang on another output that wants the report in rich-text mode.
+            const auto guard = withoutRichTextMode(report_);
+            error = showReportContent(report_, document, &notes);
+        }
         if (error) {
             problem_ = Xlate("the report begins as rich text, but %1 (line %2, column %3)")
                            .arg(error->text, QString::number(error->place.line), QString::number(error->place.column));

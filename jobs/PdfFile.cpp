@@ -1,5 +1,6 @@
 #include "PdfFile.h"
 
+#include "ReportPages.h"
 #include "UReportDoc.h"
 
 #include <QByteArray>

@@ -75,8 +75,7 @@ void PageWriter::clear()
 bool PageWriter::emptyIntoOutlet()
 {
     bool isTaken = false;
-    losesNothing(
-        [&] { isTaken = text_.isNarrow() ? outlet_->write(text_.narrowView()) : outlet_->write(text_.view()); });
+    losesNothing([&] { isTaken = text_.visit([this](auto text) { return outlet_->write(text); }); });
     text_.drain();
     starts_.clear();
     return isTaken;

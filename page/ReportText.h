@@ -40,6 +40,16 @@ public:
     bool isNarrow() const { return isNarrow_; }
     QLatin1StringView narrowView() const;
 
+    /// Reads the whole text as it is kept, which does not change how it is kept. Whoever reads a text asks here, not for its
+    /// form.
+    /// @param read  is given a `QLatin1StringView` or a `QStringView`, which is valid until the next change
+    /// @return what it answers
+    template <typename Read>
+    auto visit(Read read) const
+    {
+        return isNarrow_ ? read(narrowView()) : read(view());
+    }
+
     /// Hands the text on in pieces, in their order, as it is kept: nothing is moved, no edit carried out and no memory
     /// asked for.
     /// @param take  is given a `QLatin1StringView` or a `QStringView`, never empty

@@ -125,14 +125,13 @@ TextLoading finished(TextLoading answer, LoadedText &loaded)
 
 void LoadedText::findPages()
 {
-    const bool isSource =
-        text.isNarrow() ? isRichText(QByteArrayView(text.narrowView())) : isRichText(QStringView(text.view()));
-    if (isSource) {
-        return; // its lines are not those that it shows
-    }
-    pageStarts = text.isNarrow() ? pageHeadersIn(text.narrowView()) : pageHeadersIn(text.view());
-    linesPerPage = text.isNarrow() ? linesBetweenPageHeaders(text.narrowView(), pageStarts)
-                                   : linesBetweenPageHeaders(text.view(), pageStarts);
+    text.visit([this](auto characters) {
+        if (isRichText(characters)) {
+            return; // its lines are not those that it shows
+        }
+        pageStarts = pageHeadersIn(characters);
+        linesPerPage = linesBetweenPageHeaders(characters, pageStarts);
+    });
 }
 
 TextLoading loadReportText(QByteArrayView bytes, LoadedText &loaded, const std::function<bool(qint64)> &proceed)

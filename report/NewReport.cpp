@@ -1,5 +1,6 @@
 #include "NewReport.h"
 
+#include "AutoDeleteGuard.h"
 #include "CViewPane.h"
 #include "MemoryLasts.h"
 #include "ReportEntry.h"
@@ -15,12 +16,12 @@ namespace
 /// Closes a report that could not be made. A pane that was given stays, with the views of others in it.
 void discard(UReportDoc &report, CViewPane *given)
 {
-    const bool autoDelete = report.IsAutoDelete();
-    report.SetAutoDelete(false);
-    while (given != nullptr && CViewPane::IsOpen(given) && !report.GetViews().empty()) {
-        given->RemoveView(report.GetViews().front());
+    {
+        const auto guard = withoutAutoDelete(report);
+        while (given != nullptr && CViewPane::IsOpen(given) && !report.GetViews().empty()) {
+            given->RemoveView(report.GetViews().front());
+        }
     }
-    report.SetAutoDelete(autoDelete);
     report.OnCloseDocument();
 }
 

@@ -1,6 +1,7 @@
 #include "ReportViews.h"
 
 #include "CViewPane.h"
+#include "ReportEntry.h"
 #include "UView.h"
 
 #include <algorithm>
@@ -19,6 +20,16 @@ std::vector<UView *> reportViews(const UReportDoc &report)
     std::vector<UView *> views;
     std::copy_if(report.GetViews().begin(), report.GetViews().end(), std::back_inserter(views), showsReport);
     return views;
+}
+
+void openOwnPane(UReportDoc &report)
+{
+    if (UDocTemplate *reportTemplate = GetReportTemplate()) {
+        if (CViewPane *pane = reportTemplate->CreateNewPane(&report, nullptr, UReportDoc::ownPaneStyle, nullptr)) {
+            reportTemplate->InitialUpdatePane(pane, &report, 1);
+            noteOwnPane(*pane, true);
+        }
+    }
 }
 
 void noteOwnPane(const CViewPane &pane, bool shown)

@@ -16,6 +16,8 @@ bool showsReport(const UView *view);
 /// The views that show a report's text, in their order.
 std::vector<UView *> reportViews(const UReportDoc &report);
 
+/// Opens a new pane for a report, and notes that it is the report's own. Nothing without the template for reports.
+void openOwnPane(UReportDoc &report);
 /// Notes that the report has made a pane for itself. @param shown  whether it is shown as well
 void noteOwnPane(const CViewPane &pane, bool shown);
 /// Shows or hides a pane in which the report stands, and notes of one of its own that it did.

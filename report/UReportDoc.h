@@ -1,43 +1,47 @@
 #pragma once
 
 #include "KaReportExport.h"
-#include "PageMeasurement.h"
-#include "PageWriter.h"
-#include "ReportPages.h"
-#include "ReportTextCodec.h"
-#include "RichTextImage.h"
-#include "UDataObjectList.h"
 #include "UDocument.h"
-#include "UJobSettings.h"
-#include "UXmlReportBlock.h"
-#include "UXmlReportTable.h"
-#include "UXmlReportTpl.h"
 
 #include <QMargins>
 #include <QSize>
 #include <QString>
+#include <QStringView>
 
 #include <functional>
 #include <memory>
 #include <optional>
 #include <unordered_map>
+#include <vector>
 
 class CViewPane;
 class QIODevice;
+class UDataObject;
+class UDataObjectList;
+class UJobSettings;
+class UXmlReportTpl;
+struct sXmlReportField;
 
 namespace kareport
 {
+class ReportTextWriter;
 class ReportWindow;
-struct FormatOptions;
+enum class LineEnds;
 struct LoadedText;
 struct PdfNotes;
+struct ReportPage;
+struct ReportParts;
 } // namespace kareport
 
 /// A report: fixed-pitch text laid out in pages and lines, written by host code or through a template.
 ///
 /// Reports are made through their document template (`CreateReport`), which owns them. Functions answer false or 0 when
 /// they cannot do what they are asked, and never throw. What writes text, line ends or a page header sets the modified flag.
-class KAREPORT_EXPORT UReportDoc : public UDocument, private kareport::PageWriterObserver
+///
+/// Three things surprise a newcomer and are meant. An update of the views (`UpdateAllViews`) starts the user's editor when
+/// the report is marked for it, and may close the report. `SaveFile` answers 1 also when the save failed. A report that has
+/// lost text because memory ran out (`HasLostText`) is never saved.
+class KAREPORT_EXPORT UReportDoc : public UDocument
 {
 public:
     /// @param name            title and report file name; a null text for none
@@ -51,30 +55,28 @@ public:
 
     /// Whether a pointer is a report that is still alive.
     static bool IsReportAvailable(const UReportDoc *report);
+    /// Always "": a report is known by its object, not by an id.
+    QString GetDocId() const;
+    /// Always false.
+    bool IsThatDocId(const QString &) const;
 
-    // --- Text -------------------------------------------------------------------------------------------------------
+    // --- Text: UReportDocText.cpp -----------------------------------------------------------------------------------
 
-    /// The report text, lines ended by CR LF, with a 0 behind it; valid until the next write.
-    const char16_t *GetData() const { return page_.text().data(); }
+    /// The report text, lines ended by CR LF, followed by a 0; valid until the next write. A text without a character above
+    /// U+00FF is kept with one byte a character until it is asked for here, which doubles its memory until the next `Clear`.
+    const char16_t *GetData() const;
     /// The same with its length, for texts that hold a character 0.
-    QStringView GetText() const { return page_.text().view(); }
-    bool IsEmpty() const { return page_.text().isEmpty(); }
+    QStringView GetText() const;
+    bool IsEmpty() const;
     /// Whether a part of what was to be written, or set, since the last `Clear` is missing because memory has ended. Such a
     /// report is not saved, also when nothing is left of it.
-    bool HasLostText() const { return page_.hasLostText(); }
-    /// Writes the text to an open device, in UTF-8. @return false as soon as a write fails
-    bool WriteText(QIODevice &device, kareport::LineEnds lineEnds) const;
+    bool HasLostText() const;
     /// Hands the text on to a writer while it is written, so that a report that only becomes a file may be longer than there
     /// is memory: the document then holds no more than its end, and `Clear` does not take back what was handed on. Null
     /// keeps the text. The writer must live until `EndTextStream`, or until another one or null is set.
-    void StreamText(kareport::ReportTextWriter *writer) { page_.setOutlet(writer); }
+    void StreamText(kareport::ReportTextWriter *writer);
     /// Hands the rest on, ends the writer's text and keeps the text from now on. @return whether the writer has all of it
     bool EndTextStream(kareport::ReportTextWriter &writer);
-    /// Writes the text to an open device as a PDF. @param notes  receives what is missing or went wrong; may be null
-    /// @param progress  is told the pages done and all pages; its false stops the work. May be empty
-    /// @return false when there is no measured page or no font, a write fails, or the work was stopped
-    bool WritePdf(QIODevice &device, kareport::PdfNotes *notes = nullptr,
-                  const std::function<bool(qint64, qint64)> &progress = {}) const;
     /// Replaces the text as it is. Counters stay, so what is written next continues the old pages. Where its pages begin is
     /// found by its page headers. Without memory for it the text is empty, and lost.
     void SetData(const QString &text);
@@ -87,12 +89,12 @@ public:
     /// @param at  the first character replaced, from 0
     /// @return false, changing nothing, for a piece that is not in the text or when there is no memory
     bool ReplaceText(qint64 at, qint64 removed, QStringView inserted);
-    /// The text's length in characters, and the text as a copy: neither changes how the text is kept.
-    qint64 GetTextLength() const { return page_.text().size(); }
+    /// The text's length in characters.
+    qint64 GetTextLength() const;
     /// How often a text took the place of another, in whole or in part. What is only written at the end does not count: it
     /// changes the length.
-    quint64 GetEditCount() const { return editCount_; }
-    /// Empty when there is no memory for it.
+    quint64 GetEditCount() const;
+    /// A copy of the text, which does not change how the text is kept. Empty when there is no memory for it.
     QString CopyText() const;
     /// A copy of a piece of the text: of as many characters of it as there are. @param at  the first character, from 0
     /// @return empty when there is no memory for it
@@ -121,15 +123,19 @@ public:
     /// Builds the header line anew from application, title and the time of now.
     void SetHeader();
     void WriteHeader();
-    void SetHeaderFlag(bool on) { page_.setHeaderFlag(on); }
-    bool GetHeaderFlag() const { return page_.headerFlag(); }
+    void SetHeaderFlag(bool on);
+    bool GetHeaderFlag() const;
 
-    // --- Rich text --------------------------------------------------------------------------------------------------
+    int GetLineCount() const;  ///< 0: nothing has been written yet
+    int GetLineNumber() const; ///< on the page, from 1
+    int GetPageNumber() const; ///< from 1
+
+    // --- Rich text: UReportDocRichText.cpp --------------------------------------------------------------------------
 
     /// Switches rich-text mode: while it is on, what is written goes into a rich-text image as well. Without memory for it the
     /// mode stays off, and the report has lost text.
     void SetRTFDataFlag(bool on);
-    bool GetRTFDataFlag() const { return image_.isOn(); }
+    bool GetRTFDataFlag() const;
     /// Cuts a rich-text document down to its paragraph. @return false, with the text as it was, when it has none or memory
     /// ends
     static bool ResetFormatString(QString &document);
@@ -146,7 +152,7 @@ public:
     /// @return false as soon as a write fails, when memory ends or when the report has lost text
     bool WriteRichTextFile(QIODevice &device) const;
 
-    // --- Page -------------------------------------------------------------------------------------------------------
+    // --- Pages: UReportDocPages.cpp ---------------------------------------------------------------------------------
 
     /// Measures the page on the default printer. @return 1, or 0 without a printer: the figures then stay as they were
     int SetPageSize();
@@ -154,12 +160,12 @@ public:
     /// measured. What is not given is measured again by the next `SetPageSize`.
     void FixPage(std::optional<int> linesPerPage, std::optional<int> charsPerRow);
     /// Whether the lines of a page are those given to `FixPage`, and not measured.
-    bool IsPageFixed() const { return usesGivenPage_ && fixedLinesPerPage_.has_value(); }
+    bool IsPageFixed() const;
     /// Switches between the lines of a page that were given and those that are measured, which the next `SetPageSize` does.
     /// `FixPage` switches back to the given ones.
     void UseGivenPage(bool on);
     /// The lines of a page that were given to `FixPage`, whether they count or not.
-    std::optional<int> GetGivenLinesPerPage() const { return fixedLinesPerPage_; }
+    std::optional<int> GetGivenLinesPerPage() const;
 
     /// Whether the text is the source of a rich-text document, which is shown in its place.
     bool HoldsRichTextSource() const;
@@ -168,35 +174,32 @@ public:
     std::vector<kareport::ReportPage> GetPages() const;
     /// Where pages begin, as the writer recorded it: the places of characters in the text, from 0, in ascending order. A
     /// place that does not stand at the beginning of a line counts for nothing.
-    const std::vector<qint64> &GetPageStarts() const { return page_.pageStarts().positions(); }
-    void SetPageStarts(std::vector<qint64> starts) { page_.setPageStarts(std::move(starts)); }
+    const std::vector<qint64> &GetPageStarts() const;
+    void SetPageStarts(std::vector<qint64> starts);
     /// Takes the page headers in the text from a place on for the page starts there. Nothing where there is none.
     /// @return whether there was one
     bool FindPageStarts(qint64 from = 0);
     /// The lines, from 0, that pages begin with; text before the first of them has pages by counting lines.
     std::vector<qint64> GetPageStartLines() const;
 
-    int GetLinesPerPage() const { return page_.linesPerPage(); }
-    int GetCharsPerRow() const { return geometry_.charsPerRow; }
-    int GetLineCount() const { return page_.lineCount(); }               ///< 0: nothing has been written yet
-    int GetLineNumber() const { return page_.lineNumber(); }             ///< on the page, from 1
-    int GetPageNumber() const { return page_.pageNumber(); }             ///< from 1
-    unsigned GetPrintResolution() const { return geometry_.resolution; } ///< vertical dots per inch; 0: not measured
-    QSize GetPageSize() const { return geometry_.pageSize; }             ///< whole sheet in printer dots
-    unsigned GetFontSize() const { return fontSize_; }                   ///< points
-    void SetFontSize(unsigned points) { fontSize_ = points; }            ///< does not measure again
-    QString GetFontName() const { return fontName_; }
-    void SetFontName(const QString &name) { fontName_ = name; } ///< does not measure again
+    int GetLinesPerPage() const;
+    int GetCharsPerRow() const;
+    unsigned GetPrintResolution() const; ///< vertical dots per inch; 0: not measured
+    QSize GetPageSize() const;           ///< whole sheet in printer dots
+    unsigned GetFontSize() const;        ///< points
+    void SetFontSize(unsigned points);   ///< does not measure again
+    QString GetFontName() const;
+    void SetFontName(const QString &name); ///< does not measure again
     /// Hundredths of a millimetre.
-    QMargins GetMargins() const { return margins_; }
+    QMargins GetMargins() const;
     /// Stores the margins; `SaveSettings` keeps them for later reports and `SetPageSize` measures with them.
-    void SetMargins(const QMargins &margins) { margins_ = margins; }
+    void SetMargins(const QMargins &margins);
     /// Reads the margins and the font size from the user's preferences.
     void LoadSettings();
     /// Writes the margins to the user's preferences.
     void SaveSettings();
 
-    // --- Templates and data -----------------------------------------------------------------------------------------
+    // --- Templates and data: UReportDocTemplate.cpp -----------------------------------------------------------------
 
     /// Loads a template from a file of the library folder or, failing that, of the start folder, and with it a table
     /// and a block unless their names are empty. Takes over the template's separator and page breaks, and its title once
@@ -209,8 +212,8 @@ public:
     /// fails. @return false without a template, when it has no such table or block or not its dictionary, or without memory
     bool LoadTemplateTable(const QString &tableName);
     bool LoadTemplateBlock(const QString &blockName);
-    /// The loaded template, or null.
-    const UXmlReportTpl *GetTemplate() const { return template_.get(); }
+    /// The loaded template, or null. It is the report's, and goes when another one is loaded.
+    const UXmlReportTpl *GetTemplate() const;
 
     /// The text of a value, fitted to its field. @param kind  what `value` points to: 1 a bool, 2 a qint16, 4 a qint32,
     /// 8 a double in internal units, 16 a QString, 32 a UPointNumber; any other, or null, for no value
@@ -222,38 +225,40 @@ public:
     /// @return false, with nothing written, when no block is loaded or the object is null; false as well when memory ends in
     ///         the middle: what comes then is not written
     bool WriteDataBlock(const UDataObject *object, int linesBefore, int linesAfter);
+    /// Loads a block and writes through it, as the two functions do.
     bool WriteDataBlock(const QString &blockName, const UDataObject *object, int linesBefore, int linesAfter);
     /// Writes a list through the loaded table: heading, then a line for each object, sorted if the table says so.
-    /// @param headingLinesAfter  line ends behind the heading; -1 for 2
+    /// @param headingLinesAfter  line ends after the heading; -1 for 2
     /// @return false, with nothing written, when no table is loaded or the list is null; false as well when memory ends in
     ///         the middle: what comes then is not written
     bool WriteDataTable(UDataObjectList *list, int linesBefore, int linesAfter, int headingLinesAfter);
+    /// Loads a table and writes through it, as the two functions do.
     bool WriteDataTable(const QString &tableName, UDataObjectList *list, int linesBefore, int linesAfter,
                         int headingLinesAfter);
 
-    void SetJobSettings(const UJobSettings &settings) { settings_ = settings; }
-    const UJobSettings &GetJobSettings() const { return settings_; }
+    void SetJobSettings(const UJobSettings &settings);
+    const UJobSettings &GetJobSettings() const;
     /// Replaces the caption of the chainage column in table headings.
-    void SetChainageLabel(const QString &label) { chainageLabel_ = label; }
+    void SetChainageLabel(const QString &label);
     /// The character between columns; `raw` takes the character 255 instead.
     void SetDataColumnSeparator(char16_t separator, bool raw);
-    char16_t GetDataColumnSeparator() const { return separator_; }
+    char16_t GetDataColumnSeparator() const;
     /// Columns for a spreadsheet: no header, a tab between them.
     void SetExcelFormat();
     /// Whether data tables print their name.
-    void WriteTableName(bool on) { writeTableName_ = on; }
+    void WriteTableName(bool on);
     /// Whether values of zero print as blanks.
-    void SetZeroBlank(bool on) { zeroBlank_ = on; }
-    bool IsZeroBlank() const { return zeroBlank_; }
-    bool GetPageBreaks() const { return pageBreaks_; } ///< the loaded template's option
+    void SetZeroBlank(bool on);
+    bool IsZeroBlank() const;
+    bool GetPageBreaks() const; ///< the loaded template's option
 
-    // --- Identity, title, windows -----------------------------------------------------------------------------------
+    // --- Title, panes and report window: UReportDocPanes.cpp ---------------------------------------------------------
 
     /// The window style of a pane that a report opens for itself.
     static constexpr unsigned ownPaneStyle = 4096;
 
-    QString &GetTitle() { return title_; }
-    const QString &GetTitle() const { return title_; }
+    QString &GetTitle();
+    const QString &GetTitle() const;
     /// Sets the title and the header line. While an open pane of another document has the title as its caption, the
     /// document's title gets a number from 2 after it; the header line keeps the title as given. An empty title gets none.
     void SetTitle(const QString &title) override;
@@ -263,17 +268,10 @@ public:
     CViewPane *GetFrameWindow() const;
     /// Opens a new pane for the report and updates all views. @param reserved  not looked at
     void Activate(bool reserved);
-    /// Always "": a report is known by its object, not by an id.
-    QString GetDocId() const { return QString(); }
-    /// Always false.
-    bool IsThatDocId(const QString &) const { return false; }
 
-    /// The name that temporary files are named after.
-    void SetReportFileName(const QString &name) { reportFileName_ = name; }
-    const QString &GetReportFileName() const { return reportFileName_; }
     /// Links a report window, which the document destroys with itself; null takes the link away.
-    void SetReportWindow(kareport::ReportWindow *window) { reportWindow_ = window; }
-    kareport::ReportWindow *GetReportWindow() const { return reportWindow_; }
+    void SetReportWindow(kareport::ReportWindow *window);
+    kareport::ReportWindow *GetReportWindow() const;
     /// Lets the report in its window be saved, printed and opened, and gives the keyboard to the window; nothing without
     /// one.
     void SetReportWindowActive();
@@ -284,25 +282,23 @@ public:
     /// under it, between blank lines.
     /// @param name  a null text leaves title and file name as they are
     void UpdateReportInfo(const QString &name, bool headerFlag, bool externalEditor);
-    /// Links the host document that takes the edited text, and the number of its object there.
-    void SetTextObject(void *object, unsigned id);
-    bool HasTextObj() const { return textObjectId_ != 0; }
-    void *GetTextObject() const { return textObject_; }
+    /// The report's window shows it as well.
+    bool IsShown(const CViewPane *except = nullptr) const override;
 
-    void SetExternalEditorFlag(bool on) { externalEditor_ = on; }
-    bool GetExternalEditorFlag() const { return externalEditor_; }
-    /// Whether the report's text was loaded from a rich-text file.
-    bool IsOpenedFromRtf() const { return openedFromRtf_; }
-    void SetOptionExcel() { exportOptions_ |= optionExcel; }
-    bool IsOptionExcel() const { return (exportOptions_ & optionExcel) != 0; }
-    void SetExternalExcel() { exportOptions_ |= externalExcel; }
-    bool IsExternalExcel() const { return (exportOptions_ & externalExcel) != 0; }
+    // --- External editor: UReportDocEditor.cpp ----------------------------------------------------------------------
 
-    // --- External editor --------------------------------------------------------------------------------------------
-
+    /// Marks the report for the user's preferred editor.
+    void SetExternalEditorFlag(bool on);
+    bool GetExternalEditorFlag() const;
     /// Whether the report goes to the user's preferred editor: it is marked for it, and an editor is preferred and
     /// installed. The preferences are looked up each time.
     bool UsePreferredReportEditor() const;
+    /// Lets the report go to the spreadsheet as to a word processor.
+    void SetOptionExcel();
+    bool IsOptionExcel() const;
+    /// The rich-text image is for the spreadsheet: it holds the bare texts.
+    void SetExternalExcel();
+    bool IsExternalExcel() const;
     /// Whether a file is to be converted to rich text for an editor: for a word processor, unless it is rich text or a PDF
     /// already. With the Excel option and Excel for an editor, the report is an external Excel's from then on.
     bool IsConvertToOpenInWord(const QString &file, const QString &editor);
@@ -310,6 +306,9 @@ public:
     /// file and opened there, each time; its pane is hidden. Any other updates its views and shows its pane. Property panes
     /// are told in either case. With the close-document flag the pane stays as it is, and a report that went to the editor
     /// closes.
+    ///
+    /// So whatever updates the views starts the editor and may close the report, an edit in the view included: callers look
+    /// at `IsReportAvailable` before they go on. The flag is cleared for a moment where only views are to be updated.
     void UpdateAllViews(UView *sender, long hint = 0, void *hintObject = nullptr) override;
     /// Makes a second, hidden report in rich-text mode of the lines of this one, without blank lines, and opens it in the
     /// user's preferred editor. It stays open. Nothing happens without the application's template for reports.
@@ -317,138 +316,78 @@ public:
     /// Opens the report in the user's preferred editor: what was written in rich-text mode for a word processor, the text
     /// for any other. A report that does not go there is shown in its view, in a new pane where it has none.
     void ReportRTfData();
+    /// The name that temporary files are named after.
+    void SetReportFileName(const QString &name);
+    const QString &GetReportFileName() const;
+    /// A temporary name for the report that no report has had; empty when memory ends.
+    QString GetCurrentReportFileName() const;
 
-    // --- Files ------------------------------------------------------------------------------------------------------
+    // --- Saving: UReportDocSave.cpp ---------------------------------------------------------------------------------
 
     /// Saves under a path; asks for one when it is empty or is to become the document's own.
     /// @return false when the dialog is cancelled, with nothing changed, or the save fails
     bool DoSave(const QString &path, bool replace) override;
     /// Writes the file in one step. The name's ending says what: ".rtf" the rich text of the report's view, ".pdf" a PDF,
-    /// any other the report text. An empty report text is saved by doing nothing.
+    /// any other the report text. An empty report text is saved by doing nothing: no file is made and none is emptied.
     /// @return false when it could not be written, or the report has lost text: an earlier file is then as it was
     bool OnSaveDocument(const QString &path) override;
     /// Why the last `OnSaveDocument` failed, as the end of a sentence; empty when it did not, or nothing is known.
-    const QString &GetSaveProblem() const { return saveProblem_; }
-    /// Saves through `OnSaveDocument`. @return 0 for an empty path, else 1 whether the save succeeded or not: callers go on
-    /// either way
+    const QString &GetSaveProblem() const;
+    /// Saves through `OnSaveDocument`. @return 0 for an empty path, else 1, whether the save succeeded or not: callers go on
+    /// either way. Who needs to know calls `OnSaveDocument`
     int SaveFile(const QString &path);
+    /// Writes the text to an open device, in UTF-8. @return false as soon as a write fails
+    bool WriteText(QIODevice &device, kareport::LineEnds lineEnds) const;
+    /// Writes the text to an open device as a PDF. @param notes  receives what is missing or went wrong; may be null
+    /// @param progress  is told the pages done and all pages; its false stops the work. May be empty
+    /// @return false when there is no measured page or no font, a write fails, or the work was stopped
+    bool WritePdf(QIODevice &device, kareport::PdfNotes *notes = nullptr,
+                  const std::function<bool(qint64, qint64)> &progress = {}) const;
+
+    // --- Opening: UReportDocOpen.cpp --------------------------------------------------------------------------------
+
+    bool OnNewDocument() override;
     bool OnOpenDocument(const QString &path) override;
     void Serialize(UArchive &archive) override;
     /// Reads a report file, or a rich-text file, at the end of what the report holds.
     /// @param keepLineEnds  whether the lines keep their own line ends before the one that each of them gets
     /// @return 0 for an empty path, a file that cannot be opened or one that there is no memory for, else 1
     int LoadFile(const QString &path, bool keepLineEnds);
-    /// A temporary name for the report that no report has had; empty when memory ends.
-    QString GetCurrentReportFileName() const;
+    /// Whether the report's text was loaded from a rich-text file.
+    bool IsOpenedFromRtf() const;
+
+    // --- The text of a host's object: UReportDocTextObject.cpp ------------------------------------------------------
+
+    /// Links the host document that takes the edited text, and the number of its object there. @param object  a `UDocument`
+    /// of the application, not owned; it may go before the report
+    void SetTextObject(void *object, unsigned id);
+    bool HasTextObj() const; ///< whether the number is not 0
+    void *GetTextObject() const;
     /// Gives the text that the user edited in the view back to the object that the report was made from.
     void SaveText();
 
-    // --- Life -------------------------------------------------------------------------------------------------------
+    // --- Closing: UReportDocClose.cpp -------------------------------------------------------------------------------
 
-    bool OnNewDocument() override;
     bool CanCloseFrame(CViewPane *pane) override;
-    /// The report's window shows it as well.
-    bool IsShown(const CViewPane *except = nullptr) const override;
     void OnCloseDocument() override;
     void OnAutoDelete() override;
     /// Closes the report at once or, when closing has been deferred, asks for it: the next call closes.
     void CloseReportDocument();
     /// 0 closes normally, 1 defers closing, 2 closing has been asked for.
-    void SetCloseDocument(int mode) { closeMode_ = mode; }
+    void SetCloseDocument(int mode);
     /// What `SetCloseDocument` was given last, 2 after `CloseReportDocument`; 0 at first.
-    int GetCloseDocument() const { return closeMode_; }
-    void SetCloseDocumentFlag(bool on) { closeDocument_ = on; }
-    bool GetCloseDocumentFlag() const { return closeDocument_; }
+    int GetCloseDocument() const;
+    /// Closes the report as soon as its content has been handed to an editor.
+    void SetCloseDocumentFlag(bool on);
+    bool GetCloseDocumentFlag() const;
     /// 0 forbids closing the report's panes.
-    void SetCanClose(int can) { canClose_ = can; }
-    void EnableCloseOption(bool on) { closeOptionEnabled_ = on; }
-    bool EnableCloseOption() const { return closeOptionEnabled_; }
+    void SetCanClose(int can);
+    void EnableCloseOption(bool on);
+    bool EnableCloseOption() const;
 
 private:
-    enum ExportOption : unsigned
-    {
-        optionExcel = 1,
-        externalExcel = 2
-    };
-
-    bool takesText() const override { return image_.isOn() || reportWindow_ != nullptr; }
-    bool textWritten(QStringView text, int style) override;
-    bool lineEnded() override;
-    void changed() override;
-
-    kareport::FormatOptions formatOptions() const;
-    kareport::RichTextImage::Form imageForm() const;
-    void applyGivenPage();
-    int measurePage();
-    bool loadTemplate(const QString &fileName, const QString &templateName, const QString &tableName,
-                      const QString &blockName);
-    template <typename Work>
-    bool writeData(Work write);
-    bool saveByName(const QString &path);
-    bool saveUnderChosenName(const QString &path, bool replace);
-    void readLines(QIODevice &file, bool mayBeRichText, bool keepLineEnds);
-    void sendText();
-    bool findPageStarts(qint64 from);
-    void takeUp(const QString &name, bool headerFlag, bool externalEditor);
-    bool writeAsPdf(QIODevice &device, kareport::PdfNotes *notes,
-                    const std::function<bool(qint64, qint64)> &progress) const;
-    bool saveText(const QString &path);
-    std::optional<bool> saveViewAsRichText(const QString &path);
-    /// Opens a file that was saved in the user's preferred editor, if the report is marked for it.
-    void openSavedFile(const QString &path);
-    /// The editor that the report goes to; empty when it goes to none.
-    QString editorForReport() const;
-    void openInEditor(const QString &editor);
-    void openWrittenInEditor(const QString &editor);
-    void convertForEditor();
-    /// Saves under a temporary name, or under the next one that is free, in a file that only the user can read.
-    /// @return the name; empty when no name is free
-    QString saveForEditor(QString name);
-    /// Writes the rich-text image beside a temporary name. @return the file; empty when it cannot be written
-    QString writeRichTextForEditor(const QString &name) const;
-    /// Writes the lines of another report's text.
-    void writeLinesOf(const kareport::ReportText &text);
-    void showInModule();
-    void showFrame();
-    void openOwnPane();
-
     /// Every live report, with the value true.
     static std::unordered_map<const UReportDoc *, bool> UReportMgr;
-    /// Whether a value wider than its column prints as "#": one setting for all reports.
-    static bool printHash_;
 
-    std::unique_ptr<UXmlReportTpl> template_;
-    std::unique_ptr<UXmlReportTable> table_;
-    std::unique_ptr<UXmlReportBlock> block_;
-    UJobSettings settings_;
-    char16_t separator_ = u' ';
-    bool pageBreaks_ = true;
-    bool writeTableName_ = false;
-    bool zeroBlank_ = false;
-    UDocument *owner_;
-    kareport::PageWriter page_;
-    kareport::PageGeometry geometry_;
-    std::optional<int> fixedLinesPerPage_;
-    bool usesGivenPage_ = true;
-    std::optional<int> fixedCharsPerRow_;
-    QMargins margins_ = {1000, 1000, 1200, 2000};
-    QString title_;
-    QString fontName_ = QStringLiteral("Lucida Console");
-    unsigned fontSize_ = 8;
-    bool externalEditor_;
-    int canClose_ = 1;
-    QString reportFileName_;
-    kareport::ReportWindow *reportWindow_ = nullptr;
-    int closeMode_ = 0;
-    bool closeDocument_;
-    quint64 editCount_ = 0;
-    bool openedFromRtf_ = false;
-    QString saveProblem_;
-    bool isSerializing_ = false;
-    kareport::RichTextImage image_;
-    void *textObject_ = nullptr;
-    unsigned textObjectId_ = 0;
-    bool closeOptionEnabled_ = true;
-    unsigned exportOptions_ = 0;
-    QString chainageLabel_;
+    std::unique_ptr<kareport::ReportParts> parts_; ///< never null
 };

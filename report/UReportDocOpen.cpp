@@ -3,12 +3,17 @@
 #include "AppMessageBox.h"
 #include "MemoryLasts.h"
 #include "ReportFileReader.h"
+#include "ReportGuards.h"
+#include "ReportParts.h"
 #include "RichTextReader.h"
 #include "StandardText.h"
 #include "UArchive.h"
 #include "UView.h"
 
 #include <QFile>
+
+#include <optional>
+#include <utility>
 
 namespace
 {
@@ -31,11 +36,55 @@ bool holdsRichText(const QString &path)
     return file.open(QIODevice::ReadOnly) && kareport::isRichText(file.readLine(longestProbe).trimmed());
 }
 
+/// Writes the lines of a file. @return whether they are the source of a rich-text document
+bool readLines(QIODevice &file, kareport::PageWriter &page, bool mayBeRichText, bool keepLineEnds)
+{
+    kareport::ReportFileReader reader(file);
+    bool isRichText = false;
+    bool isFirst = true;
+    bool isOpen = false;
+    while (reader.next()) {
+        QLatin1StringView line = reader.piece();
+        if (std::exchange(isFirst, false)) {
+            isRichText = mayBeRichText && kareport::isRichText(line.trimmed());
+        }
+        isOpen = isRichText && !line.endsWith(u'\n');
+        if (isOpen) {
+            // A line end between the pieces of a long line could cut a control word in two.
+            page.write(line, 0);
+            continue;
+        }
+        if (!keepLineEnds && line.endsWith(u'\n')) {
+            line.chop(1);
+        }
+        // What stands before the first word of a report is the byte-order mark; in rich text it is the head.
+        if (!isRichText && page.lineCount() == 0 && line.indexOf(firstWord) > 0) {
+            line = line.sliced(line.indexOf(firstWord));
+        }
+        page.writeLine(line, 0, 1, 0);
+        page.countLine();
+    }
+    if (isOpen) {
+        page.lineFeed(1);
+        page.countLine();
+    }
+    return isRichText;
+}
+
 } // namespace
+
+bool UReportDoc::OnNewDocument()
+{
+    if (!UDocument::OnNewDocument()) {
+        return false;
+    }
+    SetPageSize();
+    return true;
+}
 
 bool UReportDoc::OnOpenDocument(const QString &path)
 {
-    openedFromRtf_ = namesRichText(path);
+    parts_->openedFromRtf = namesRichText(path);
     if (!kareport::whileMemoryLasts(false, [&] { return UDocument::OnOpenDocument(path); })) {
         return false;
     }
@@ -62,18 +111,22 @@ void UReportDoc::Serialize(UArchive &archive)
     if (GetRTFDataFlag()) {
         return;
     }
-    const bool headerFlag = GetHeaderFlag();
-    SetHeaderFlag(false);
-    isSerializing_ = true;
+    const auto noHeader = kareport::withoutHeader(*this);
+    const kareport::ValueGuard serializing(parts_->isSerializing, true, [this](bool on) {
+        if (IsReportAvailable(this)) {
+            parts_->isSerializing = on;
+        }
+    });
     const bool isLoaded = LoadFile(archive.GetFilePath(), true) != 0;
-    if (!IsReportAvailable(this)) {
-        return; // a view or an editor that took the text has closed the report
-    }
-    if (!isLoaded) {
+    // A view or an editor that took the text may have closed the report.
+    if (!isLoaded && IsReportAvailable(this)) {
         archive.Abandon(); // the file has gone meanwhile, or there is no memory for it
     }
-    isSerializing_ = false;
-    SetHeaderFlag(headerFlag);
+}
+
+bool UReportDoc::IsOpenedFromRtf() const
+{
+    return parts_->openedFromRtf;
 }
 
 int UReportDoc::LoadFile(const QString &path, bool keepLineEnds)
@@ -83,7 +136,7 @@ int UReportDoc::LoadFile(const QString &path, bool keepLineEnds)
     }
     // Rich text is opened as a document; its source is what is loaded then.
     const bool isDocument = kareport::whileMemoryLasts(
-        false, [&] { return !isSerializing_ && namesRichText(path) && holdsRichText(path); });
+        false, [&] { return !parts_->isSerializing && namesRichText(path) && holdsRichText(path); });
     if (isDocument) {
         OnOpenDocument(path);
         return 1;
@@ -92,47 +145,15 @@ int UReportDoc::LoadFile(const QString &path, bool keepLineEnds)
     if (!kareport::whileMemoryLasts(false, [&] { return file.emplace(path).open(QIODevice::ReadOnly); })) {
         return 0;
     }
-    const bool isWhole = page_.losesNothing([&] { readLines(*file, namesRichText(path), keepLineEnds); });
+    const qint64 before = GetTextLength();
+    const bool isWhole = parts_->page.losesNothing([&] {
+        if (readLines(*file, parts_->page, namesRichText(path), keepLineEnds)) {
+            SetPageStarts({}); // pages are those of the text that is shown
+        } else {
+            FindPageStarts(before); // those that it was written in, not those that its lines would fill now
+        }
+    });
     file.reset();
     UpdateAllViews(nullptr, 0, nullptr); // may hand the report to an editor and close it
     return isWhole ? 1 : 0;
-}
-
-void UReportDoc::readLines(QIODevice &file, bool mayBeRichText, bool keepLineEnds)
-{
-    kareport::ReportFileReader reader(file);
-    bool isRichText = false;
-    bool isFirst = true;
-    bool isOpen = false;
-    const qint64 before = GetTextLength();
-    while (reader.next()) {
-        QLatin1StringView line = reader.piece();
-        if (std::exchange(isFirst, false)) {
-            isRichText = mayBeRichText && kareport::isRichText(QByteArrayView(line.trimmed()));
-        }
-        isOpen = isRichText && !line.endsWith(u'\n');
-        if (isOpen) {
-            // A line end between the pieces of a long line could cut a control word in two.
-            page_.write(line, 0);
-            continue;
-        }
-        if (!keepLineEnds && line.endsWith(u'\n')) {
-            line.chop(1);
-        }
-        // What stands before the first word of a report is the byte-order mark; in rich text it is the head.
-        if (!isRichText && GetLineCount() == 0 && line.indexOf(firstWord) > 0) {
-            line = line.sliced(line.indexOf(firstWord));
-        }
-        page_.writeLine(line, 0, 1, 0);
-        page_.countLine();
-    }
-    if (isOpen) {
-        page_.lineFeed(1);
-        page_.countLine();
-    }
-    if (isRichText) {
-        SetPageStarts({}); // pages are those of the text that is shown
-    } else {
-        FindPageStarts(before); // those that it was written in, not those that its lines would fill now
-    }
 }

@@ -1,19 +1,20 @@
 #include "UReportDoc.h"
 
 #include "MemoryLasts.h"
+#include "ReportParts.h"
 #include "SingleByteText.h"
 
 using kareport::RichTextImage;
 using kareport::WideCharacters;
 
-RichTextImage::Form UReportDoc::imageForm() const
-{
-    return IsExternalExcel() ? RichTextImage::Form::BareText : RichTextImage::Form::RichText;
-}
-
 void UReportDoc::SetRTFDataFlag(bool on)
 {
-    page_.losesNothing([&] { image_.setOn(on); });
+    parts_->page.losesNothing([&] { parts_->mirrors.image.setOn(on); });
+}
+
+bool UReportDoc::GetRTFDataFlag() const
+{
+    return parts_->mirrors.image.isOn();
 }
 
 bool UReportDoc::ResetFormatString(QString &document)
@@ -23,35 +24,39 @@ bool UReportDoc::ResetFormatString(QString &document)
 
 void UReportDoc::WriteRTFData(const QString &text, int style)
 {
-    if (!image_.write(text, style, imageForm())) {
-        page_.noteLostText();
+    if (!parts_->mirrors.image.write(text, style, parts_->mirrors.imageForm)) {
+        parts_->page.noteLostText();
     }
 }
 
 void UReportDoc::GetRTFData(QString &document) const
 {
-    document =
-        kareport::whileMemoryLasts(QString(), [this] { return image_.document(fontName_, fontSize_, imageForm()); });
+    document = kareport::whileMemoryLasts(QString(), [this] {
+        return parts_->mirrors.image.document(parts_->layout.fontName, parts_->layout.fontSize,
+                                              parts_->mirrors.imageForm);
+    });
 }
 
 void UReportDoc::GetFontTableData(QString &table) const
 {
-    table = kareport::whileMemoryLasts(QString(), [this] { return RichTextImage::fontTable(fontName_, fontSize_); });
+    table = kareport::whileMemoryLasts(
+        QString(), [this] { return RichTextImage::fontTable(parts_->layout.fontName, parts_->layout.fontSize); });
 }
 
 bool UReportDoc::WriteFontTable(QIODevice &device) const
 {
     return kareport::whileMemoryLasts(false, [&] {
-        return kareport::writeSingleByteText(device, RichTextImage::fontTable(fontName_, fontSize_),
-                                             WideCharacters::RichTextEscape);
+        const QString table = RichTextImage::fontTable(parts_->layout.fontName, parts_->layout.fontSize);
+        return kareport::writeSingleByteText(device, table, WideCharacters::RichTextEscape);
     });
 }
 
 bool UReportDoc::WriteRichTextFile(QIODevice &device) const
 {
     return !HasLostText() && kareport::whileMemoryLasts(false, [&] {
-        return kareport::writeSingleByteText(device, image_.document(fontName_, fontSize_, imageForm()),
-                                             IsExternalExcel() ? WideCharacters::QuestionMark
-                                                               : WideCharacters::RichTextEscape);
+        const QString document =
+            parts_->mirrors.image.document(parts_->layout.fontName, parts_->layout.fontSize, parts_->mirrors.imageForm);
+        return kareport::writeSingleByteText(
+            device, document, IsExternalExcel() ? WideCharacters::QuestionMark : WideCharacters::RichTextEscape);
     });
 }

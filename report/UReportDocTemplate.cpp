@@ -1,23 +1,21 @@
 #include "UReportDoc.h"
 
 #include "DataWriter.h"
-#include "FieldFormatter.h"
-#include "Folders.h"
 #include "MemoryLasts.h"
-
-#include <QDir>
-
-#include <utility>
+#include "ReportParts.h"
 
 namespace
 {
 
-QString fileIn(QString folder, const QString &fileName)
+/// Writes data. @return whether all of it was written
+template <typename Work>
+bool writeData(kareport::PageWriter &page, Work write)
 {
-    if (!folder.endsWith(u'/') && !folder.endsWith(QDir::separator())) {
-        folder += QDir::separator();
+    if (page.losesNothing(write)) {
+        return true;
     }
-    return folder + fileName;
+    page.setHeading({QString(), 0, 2}); // a table's own must not stand over what is written next
+    return false;
 }
 
 } // namespace
@@ -25,80 +23,29 @@ QString fileIn(QString folder, const QString &fileName)
 bool UReportDoc::LoadTemplateXml(const QString &fileName, const QString &templateName, const QString &tableName,
                                  const QString &blockName)
 {
-    return kareport::whileMemoryLasts(false,
-                                      [&] { return loadTemplate(fileName, templateName, tableName, blockName); });
-}
-
-bool UReportDoc::loadTemplate(const QString &fileName, const QString &templateName, const QString &tableName,
-                              const QString &blockName)
-{
-    // The handles point into the template that goes: they go with it.
-    table_.reset();
-    block_.reset();
-    template_ = std::make_unique<UXmlReportTpl>();
-    if (!template_->LoadTemplate(fileIn(GetLibraryDir(false), fileName), templateName) &&
-        !template_->LoadTemplate(fileIn(GetStartPathName(), fileName), templateName))
-    {
-        return false;
-    }
-    pageBreaks_ = template_->GetPageBreakXmlOption();
-    // The option is a signed 8-bit character and is widened with its sign.
-    separator_ =
-        static_cast<char16_t>(static_cast<qint16>(static_cast<signed char>(template_->GetSeparatorXmlOption())));
-    if (!tableName.isEmpty() && !LoadTemplateTable(tableName)) {
-        return false;
-    }
-    if (!blockName.isEmpty() && !LoadTemplateBlock(blockName)) {
-        return false;
-    }
-    const quint64 losses = page_.losses();
-    SetTitle(template_->GetTemplateTitle());
-    return page_.losses() == losses;
+    return kareport::whileMemoryLasts(false, [&] {
+        if (!parts_->data.load(fileName, templateName, tableName, blockName)) {
+            return false;
+        }
+        const quint64 losses = parts_->page.losses();
+        SetTitle(parts_->data.loaded()->GetTemplateTitle());
+        return parts_->page.losses() == losses;
+    });
 }
 
 bool UReportDoc::LoadTemplateTable(const QString &tableName)
 {
-    table_.reset();
-    return kareport::whileMemoryLasts(false, [&] {
-        if (!template_) {
-            return false;
-        }
-        auto table = std::make_unique<UXmlReportTable>();
-        table->SetColumnSeparator(static_cast<char>(separator_ & 0xFF));
-        if (!table->LoadTable(tableName, template_.get())) {
-            return false;
-        }
-        if (template_->SetNorthEastTableFieldOrder(tableName, static_cast<ORIENTATION_ORDER>(settings_.northEastOrder)))
-        {
-            table->ReorderingHeading();
-        }
-        if (!table->IsLoaded()) {
-            return false;
-        }
-        table_ = std::move(table); // not before it is whole: what cannot be loaded is not written either
-        return true;
-    });
+    return kareport::whileMemoryLasts(false, [&] { return parts_->data.loadTable(tableName); });
 }
 
 bool UReportDoc::LoadTemplateBlock(const QString &blockName)
 {
-    block_.reset();
-    return kareport::whileMemoryLasts(false, [&] {
-        if (!template_) {
-            return false;
-        }
-        auto block = std::make_unique<UXmlReportBlock>();
-        if (!block->LoadBlock(blockName, template_.get())) {
-            return false;
-        }
-        block_ = std::move(block);
-        return true;
-    });
+    return kareport::whileMemoryLasts(false, [&] { return parts_->data.loadBlock(blockName); });
 }
 
-kareport::FormatOptions UReportDoc::formatOptions() const
+const UXmlReportTpl *UReportDoc::GetTemplate() const
 {
-    return {&settings_, separator_, zeroBlank_, printHash_};
+    return parts_->data.loaded();
 }
 
 QString UReportDoc::FormatXmlStringToDisplay(const sXmlReportField *field, int kind, const void *value,
@@ -107,30 +54,20 @@ QString UReportDoc::FormatXmlStringToDisplay(const sXmlReportField *field, int k
     // A column of a template may be wider than there is memory.
     return kareport::whileMemoryLasts(QString(), [&] {
         kareport::TextBuffer text;
-        kareport::FieldFormatter(*field).append(text, formatOptions(), kind, value, offsetStyle);
+        kareport::FieldFormatter(*field).append(text, parts_->data.formatOptions(), kind, value, offsetStyle);
         return text.view().toString();
     });
 }
 
-/// Writes data. @return whether all of it was written
-template <typename Work>
-bool UReportDoc::writeData(Work write)
-{
-    if (page_.losesNothing(write)) {
-        return true;
-    }
-    page_.setHeading({QString(), 0, 2}); // a table's own must not stand over what is written next
-    return false;
-}
-
 bool UReportDoc::WriteDataBlock(const UDataObject *object, int linesBefore, int linesAfter)
 {
-    if (!block_ || !block_->IsLoaded() || object == nullptr) {
+    const UXmlReportBlock *block = parts_->data.block();
+    if (block == nullptr || !block->IsLoaded() || object == nullptr) {
         return false;
     }
-    return writeData([&] {
-        const kareport::FormatOptions options = formatOptions();
-        kareport::DataWriter(page_, options).writeBlock(*block_, *object, linesBefore, linesAfter);
+    return writeData(parts_->page, [&] {
+        const kareport::FormatOptions options = parts_->data.formatOptions();
+        kareport::DataWriter(parts_->page, options).writeBlock(*block, *object, linesBefore, linesAfter);
     });
 }
 
@@ -141,13 +78,15 @@ bool UReportDoc::WriteDataBlock(const QString &blockName, const UDataObject *obj
 
 bool UReportDoc::WriteDataTable(UDataObjectList *list, int linesBefore, int linesAfter, int headingLinesAfter)
 {
-    if (!table_ || !table_->IsLoaded() || list == nullptr) {
+    const UXmlReportTable *table = parts_->data.table();
+    if (table == nullptr || !table->IsLoaded() || list == nullptr) {
         return false;
     }
-    return writeData([&] {
-        const kareport::FormatOptions options = formatOptions();
-        kareport::DataWriter(page_, options)
-            .writeTable(*table_, *list, {linesBefore, linesAfter, headingLinesAfter, chainageLabel_, writeTableName_});
+    return writeData(parts_->page, [&] {
+        const kareport::FormatOptions options = parts_->data.formatOptions();
+        kareport::DataWriter(parts_->page, options)
+            .writeTable(*table, *list,
+                        {linesBefore, linesAfter, headingLinesAfter, parts_->chainageLabel, parts_->writeTableName});
     });
 }
 
@@ -157,13 +96,53 @@ bool UReportDoc::WriteDataTable(const QString &tableName, UDataObjectList *list,
     return LoadTemplateTable(tableName) && WriteDataTable(list, linesBefore, linesAfter, headingLinesAfter);
 }
 
+void UReportDoc::SetJobSettings(const UJobSettings &settings)
+{
+    parts_->data.settings = settings;
+}
+
+const UJobSettings &UReportDoc::GetJobSettings() const
+{
+    return parts_->data.settings;
+}
+
+void UReportDoc::SetChainageLabel(const QString &label)
+{
+    parts_->chainageLabel = label;
+}
+
 void UReportDoc::SetDataColumnSeparator(char16_t separator, bool raw)
 {
-    separator_ = raw ? u'\xFF' : separator;
+    parts_->data.separator = raw ? u'\xFF' : separator;
+}
+
+char16_t UReportDoc::GetDataColumnSeparator() const
+{
+    return parts_->data.separator;
 }
 
 void UReportDoc::SetExcelFormat()
 {
     SetHeaderFlag(false);
-    separator_ = u'\t';
+    parts_->data.separator = u'\t';
+}
+
+void UReportDoc::WriteTableName(bool on)
+{
+    parts_->writeTableName = on;
+}
+
+void UReportDoc::SetZeroBlank(bool on)
+{
+    parts_->data.zeroBlank = on;
+}
+
+bool UReportDoc::IsZeroBlank() const
+{
+    return parts_->data.zeroBlank;
+}
+
+bool UReportDoc::GetPageBreaks() const
+{
+    return parts_->data.pageBreaks;
 }

@@ -3,6 +3,7 @@
 #include "AppMessageBox.h"
 #include "CViewPane.h"
 #include "ReportEntry.h"
+#include "ReportGuards.h"
 #include "ReportSaveName.h"
 #include "ReportViews.h"
 #include "UDocTemplate.h"
@@ -74,13 +75,13 @@ void UReportWindowDlg::OnPrint()
         return;
     }
     leaveForReport();
-    // The report is to open in the application, to be printed from there.
-    const bool externalEditor = report->GetExternalEditorFlag();
-    report->SetExternalEditorFlag(false);
     UDocTemplate *reportTemplate = GetReportTemplate();
     if (reportTemplate == nullptr) {
-        return; // with the flag cleared: without its template the report has no editor to go to either
+        report->SetExternalEditorFlag(false); // without its template the report has no editor to go to either
+        return;
     }
+    // The report is to open in the application, to be printed from there.
+    const auto guard = kareport::withoutEditor(*report);
     if (CViewPane *pane = reportTemplate->CreateNewPane(report, nullptr, UReportDoc::ownPaneStyle, nullptr)) {
         reportTemplate->InitialUpdatePane(pane, report, 0);
         kareport::noteOwnPane(*pane, false);
@@ -91,9 +92,6 @@ void UReportWindowDlg::OnPrint()
     if (view != nullptr) {
         view->UpdateData(true);
         view->OnReportPrint();
-    }
-    if (UReportDoc::IsReportAvailable(report)) {
-        report->SetExternalEditorFlag(externalEditor);
     }
 }
 

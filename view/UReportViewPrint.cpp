@@ -8,6 +8,7 @@
 #include "PrintJob.h"
 #include "PrintRun.h"
 #include "ReportEdit.h"
+#include "ReportOrientation.h"
 #include "ReportPrinter.h"
 #include "ReportViewWidget.h"
 #include "UPreviewDlg.h"
@@ -33,22 +34,6 @@ using kareport::PrintResult;
 
 /// A preview keeps its pages in memory.
 constexpr int mostPreviewPages = 2000;
-
-/// Prints in the report's orientation for the time of one command.
-class ReportOrientation
-{
-public:
-    ReportOrientation() : before_(UPreviewDlg::IsModulePrinterOrientationPortrait())
-    {
-        UPreviewDlg::SetModulePrinterOrientationPortrait(IsReportPrinterSetToPortrait());
-    }
-    ~ReportOrientation() { UPreviewDlg::SetModulePrinterOrientationPortrait(before_); }
-    ReportOrientation(const ReportOrientation &) = delete;
-    ReportOrientation &operator=(const ReportOrientation &) = delete;
-
-private:
-    bool before_;
-};
 
 /// The text of a view as a job begins with it. View, control and text may go while a window is open.
 class PrintedText
@@ -149,7 +134,7 @@ void UReportView::OnReportPrint(bool direct)
         sayNoRoom();
         return;
     }
-    const ReportOrientation orientation;
+    const auto orientation = kareport::reportOrientation();
     PrintInfo info;
     info.direct = direct;
     if (OnPreparePrinting(info)) {
@@ -169,7 +154,7 @@ void UReportView::OnReportPrintPreview()
         sayNoRoom();
         return;
     }
-    const ReportOrientation orientation;
+    const auto orientation = kareport::reportOrientation();
     PrintInfo info;
     info.preview = true;
     if (!OnPreparePrinting(info)) {
@@ -392,7 +377,7 @@ void UReportView::OnPageSetup()
     if (report == nullptr) {
         return;
     }
-    const ReportOrientation orientation;
+    const auto orientation = kareport::reportOrientation();
     if (!kareport::hasReportPrinter()) {
         AppMessageBox(Xlate("Failed to get default printer settings."));
         return;

@@ -8,6 +8,7 @@
 #include "LineEndings.h"
 #include "OutputClash.h"
 #include "OutputsWriter.h"
+#include "PageMeasurement.h"
 #include "ReportTextDecoder.h"
 #include "RichTextReader.h"
 #include "SavedText.h"

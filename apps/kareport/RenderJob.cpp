@@ -8,6 +8,7 @@
 #include "OutputWriter.h"
 #include "OutputsWriter.h"
 #include "ProcessSetup.h"
+#include "ReportTextCodec.h"
 #include "Signals.h"
 #include "SizeLimit.h"
 #include "Xlate.h"

@@ -79,6 +79,11 @@ bool isRichText(QStringView text)
     return text.startsWith(QLatin1StringView(beginning));
 }
 
+bool isRichText(QLatin1StringView text)
+{
+    return text.startsWith(QLatin1StringView(beginning));
+}
+
 std::optional<RichTextError> readRichText(QByteArrayView bytes, QTextDocument &document, RichTextNotes *notes)
 {
     return readBytes(bytes, RichTextRawBytes::CodePage, document, notes);

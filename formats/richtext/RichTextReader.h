@@ -4,6 +4,7 @@
 #include "TextPlaces.h"
 
 #include <QByteArrayView>
+#include <QLatin1StringView>
 #include <QString>
 #include <QStringList>
 #include <QStringView>
@@ -39,6 +40,7 @@ struct RichTextError
 /// Whether the bytes or the text begin as a rich text does: with "{\rtf".
 KAREPORT_EXPORT bool isRichText(QByteArrayView bytes);
 KAREPORT_EXPORT bool isRichText(QStringView text);
+KAREPORT_EXPORT bool isRichText(QLatin1StringView text);
 
 /// Reads the bytes of a rich-text file (RTF) into a document, whose content is replaced. Bytes from 0x80 on are read in the
 /// code page of the current font, else of the file. What stands behind the end of the outermost group is not read.

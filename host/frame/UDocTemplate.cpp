@@ -1,5 +1,6 @@
 #include "UDocTemplate.h"
 
+#include "AutoDeleteGuard.h"
 #include "CViewPane.h"
 #include "UDocument.h"
 #include "UView.h"
@@ -19,10 +20,8 @@ struct CloseUnfinishedPane
         if (!CViewPane::IsOpen(pane)) {
             return;
         }
-        const bool autoDelete = document->IsAutoDelete();
-        document->SetAutoDelete(false);
+        const auto guard = kareport::withoutAutoDelete(*document);
         pane->ClosePane();
-        document->SetAutoDelete(autoDelete);
     }
 };
 using UnfinishedPane = std::unique_ptr<CViewPane, CloseUnfinishedPane>;

@@ -1,6 +1,7 @@
 #include "UDocument.h"
 
 #include "AppMessageBox.h"
+#include "AutoDeleteGuard.h"
 #include "CViewPane.h"
 #include "ReplaceFile.h"
 #include "UApplication.h"
@@ -218,8 +219,7 @@ bool UDocument::IsShown(const CViewPane *except) const
 
 void UDocument::CloseAllPanes()
 {
-    const bool autoDelete = autoDelete_;
-    autoDelete_ = false;
+    const auto guard = kareport::withoutAutoDelete(*this);
     while (!views_.empty()) {
         UView *view = views_.front();
         if (CViewPane *pane = view->GetParentPane()) {
@@ -230,7 +230,6 @@ void UDocument::CloseAllPanes()
             RemoveView(view);
         }
     }
-    autoDelete_ = autoDelete;
 }
 
 void UDocument::OnCloseDocument()

@@ -3,6 +3,7 @@
 #include "FrameFixture.h"
 #include "Recovery.h"
 #include "ReportEdit.h"
+#include "ReportPages.h"
 #include "ReportViewWidget.h"
 #include "UReportView.h"
 

@@ -3,6 +3,7 @@
 #include "PageHeader.h"
 #include "PdfReadBack.h"
 #include "ReportEdit.h"
+#include "ReportPages.h"
 #include "ReportViewWidget.h"
 #include "SavedReports.h"
 #include "UReportView.h"

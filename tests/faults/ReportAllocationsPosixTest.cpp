@@ -2,8 +2,10 @@
 
 #include "FrameFixture.h"
 #include "ReportInitialTemplate.h"
+#include "ReportPages.h"
 #include "ReportTextCodec.h"
 #include "UArchive.h"
+#include "UXmlReportTpl.h"
 
 #include <cstdio>
 #include <iterator>

@@ -5,6 +5,8 @@
 #include "FailingAllocationPosix.h"
 #include "ReportWindowFixture.h"
 #include "TemporaryFolder.h"
+#include "UDataObjectList.h"
+#include "UPointNumber.h"
 
 #include <QBuffer>
 

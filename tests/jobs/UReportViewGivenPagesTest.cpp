@@ -4,6 +4,7 @@
 #include "PageHeader.h"
 #include "PdfReadBack.h"
 #include "PrintFixture.h"
+#include "ReportPages.h"
 #include "RichTextReader.h"
 
 #include <QFile>

@@ -4,6 +4,7 @@
 #include "PdfExport.h"
 #include "PrintGeometry.h"
 #include "ReportContent.h"
+#include "ReportPages.h"
 #include "UReportDoc.h"
 #include "UReportView.h"
 

@@ -7,6 +7,7 @@
 #include "JobLauncher.h"
 #include "ReportEdit.h"
 #include "ReportEntry.h"
+#include "ReportPages.h"
 #include "ReportTextDecoder.h"
 #include "UReportDoc.h"
 #include "UReportView.h"

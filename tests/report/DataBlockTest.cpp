@@ -1,4 +1,5 @@
 #include "DataReport.h"
+#include "UPointNumber.h"
 
 #include <gtest/gtest.h>
 

@@ -3,6 +3,7 @@
 
 #include "PdfExport.h"
 #include "PdfReadBack.h"
+#include "ReportPages.h"
 
 #include <QBuffer>
 

@@ -1,4 +1,5 @@
 #include "ReportFixture.h"
+#include "ReportTextCodec.h"
 
 #include <QBuffer>
 

@@ -2,6 +2,7 @@
 
 #include "Preferences.h"
 #include "ReportMargins.h"
+#include "sXmlReportField.h"
 
 #include <gtest/gtest.h>
 

@@ -1,5 +1,6 @@
 #include "ReportFixture.h"
 
+#include "UJobSettings.h"
 #include "sXmlReportField.h"
 
 #include <gtest/gtest.h>

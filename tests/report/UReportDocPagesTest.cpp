@@ -1,4 +1,6 @@
 #include "ReportFixture.h"
+#include "ReportPages.h"
+#include "ReportTextCodec.h"
 
 #include <QBuffer>
 #include <QTemporaryDir>

@@ -1,5 +1,9 @@
 #include "ReportFixture.h"
 #include "TemplateMarkup.h"
+#include "UDataObjectList.h"
+#include "UJobSettings.h"
+#include "UPointNumber.h"
+#include "UXmlReportTpl.h"
 
 #include <QDir>
 

@@ -1,5 +1,8 @@
 #include "ReportFixture.h"
 #include "TemplateMarkup.h"
+#include "UDataObjectList.h"
+#include "UPointNumber.h"
+#include "UXmlReportTpl.h"
 
 #include <gtest/gtest.h>
 

@@ -1,6 +1,7 @@
 #include "ReportFixture.h"
 
 #include "LoadedText.h"
+#include "PageMeasurement.h"
 #include "Preferences.h"
 
 #include <gtest/gtest.h>

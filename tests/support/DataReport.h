@@ -2,6 +2,8 @@
 
 #include "ReportFixture.h"
 #include "TemplateMarkup.h"
+#include "UDataObjectList.h"
+#include "UPointNumber.h"
 
 #include <gtest/gtest.h>
 

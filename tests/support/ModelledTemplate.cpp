@@ -1,5 +1,8 @@
 #include "ModelledTemplate.h"
 
+#include "UDataObjectList.h"
+#include "UPointNumber.h"
+
 #include <algorithm>
 #include <iterator>
 

@@ -1,0 +1,72 @@
+#include "PageLayout.h"
+
+#include "Preferences.h"
+#include "Profile.h"
+#include "ReportOrientation.h"
+
+namespace kareport
+{
+
+namespace
+{
+
+const QString marginsEntry = QStringLiteral("Report Margins");
+
+} // namespace
+
+bool PageLayout::measure()
+{
+    const auto orientation = reportOrientation();
+    const auto device = defaultPageDevice(UPreviewDlg::IsModulePrinterOrientationPortrait());
+    if (!device) {
+        return false;
+    }
+    PageGeometry measured = geometry_;
+    measured.pageSize = device->size;
+    measured.resolution = static_cast<unsigned>(device->resolution);
+    if (!isGiven() || !givenCharsPerRow_) {
+        measured = measurePage(*device, margins, measureFont(fontName, fontSize, device->resolution));
+    }
+    geometry_ = measured;
+    applyGiven();
+    return true;
+}
+
+void PageLayout::give(std::optional<int> linesPerPage, std::optional<int> charsPerRow)
+{
+    givenLinesPerPage_ = linesPerPage;
+    givenCharsPerRow_ = charsPerRow;
+    useGiven(true);
+}
+
+void PageLayout::useGiven(bool on)
+{
+    usesGiven_ = on;
+    applyGiven();
+}
+
+void PageLayout::applyGiven()
+{
+    if (isGiven()) {
+        geometry_.linesPerPage = *givenLinesPerPage_;
+    }
+    geometry_.charsPerRow = givenCharsPerRow_.value_or(geometry_.charsPerRow);
+}
+
+void PageLayout::load()
+{
+    const QString kept = GetProfileString(QString(), marginsEntry);
+    if (kept.isEmpty()) {
+        save();
+    } else {
+        margins = marginsFromText(kept, margins);
+    }
+    fontSize = GetReportFontSize();
+}
+
+void PageLayout::save() const
+{
+    WriteProfileString(QString(), marginsEntry, marginsToText(margins));
+}
+
+} // namespace kareport

@@ -1,0 +1,54 @@
+#pragma once
+
+#include "KaReportExport.h"
+#include "PageMeasurement.h"
+#include "ReportMargins.h"
+
+#include <QMargins>
+#include <QString>
+
+#include <optional>
+
+namespace kareport
+{
+
+/// The page that a report is laid out for: its margins, its font, and how much text has room between the margins, as it was
+/// measured on the default printer or as it was given.
+class KAREPORT_EXPORT PageLayout
+{
+public:
+    /// Hundredths of a millimetre. What is measured changes by `measure` alone.
+    QMargins margins = defaultMargins;
+    QString fontName = QStringLiteral("Lucida Console");
+    unsigned fontSize = 8; ///< points
+
+    const PageGeometry &geometry() const { return geometry_; }
+
+    /// Measures the page on the default printer, as the user has reports printed, upright or not; the figures that were
+    /// given stay. @return false, with the figures as they were, without a printer
+    bool measure();
+
+    /// Gives the lines of a page or the characters of a row (1 or more) in the place of what is measured. With both, no font
+    /// is measured. What is not given is measured again by the next `measure`.
+    void give(std::optional<int> linesPerPage, std::optional<int> charsPerRow);
+    /// Whether the lines that were given count.
+    bool isGiven() const { return usesGiven_ && givenLinesPerPage_.has_value(); }
+    /// Switches between the lines that were given and those that the next `measure` finds.
+    void useGiven(bool on);
+    std::optional<int> givenLinesPerPage() const { return givenLinesPerPage_; }
+
+    /// Reads margins and font size from the user's preferences; where these have no margins, they get those of now.
+    void load();
+    /// Writes the margins to the user's preferences.
+    void save() const;
+
+private:
+    void applyGiven();
+
+    PageGeometry geometry_;
+    std::optional<int> givenLinesPerPage_;
+    std::optional<int> givenCharsPerRow_;
+    bool usesGiven_ = true;
+};
+
+} // namespace kareport

@@ -1,0 +1,55 @@
+#pragma once
+
+#include "PageLayout.h"
+#include "PageWriter.h"
+#include "ReportTemplate.h"
+#include "TextMirrors.h"
+
+#include <QString>
+
+class UDocument;
+
+namespace kareport
+{
+
+/// What a report document is made of. The parts do the work and know nothing of `UReportDoc`, which joins them; what stands
+/// here by itself are the settings that its own functions read and write.
+struct ReportParts
+{
+    explicit ReportParts(UDocument &document) : mirrors(document), page(&mirrors) {}
+
+    // Text and pages
+    TextMirrors mirrors;
+    PageWriter page;
+    PageLayout layout;
+    quint64 editCount = 0;
+
+    // Templates and data
+    ReportTemplate data;
+    bool writeTableName = false;
+    QString chainageLabel;
+
+    // Title and external editor
+    QString title;
+    QString reportFileName;
+    bool externalEditor = false;
+    bool optionExcel = false;
+
+    // Files
+    QString saveProblem;
+    bool openedFromRtf = false;
+    bool isSerializing = false;
+
+    // The host's object whose text this is
+    void *textObject = nullptr;
+    unsigned textObjectId = 0;
+
+    // Closing
+    UDocument *owner = nullptr;
+    int canClose = 1;
+    int closeMode = 0;
+    bool closeDocument = false;
+    bool closeOptionEnabled = true;
+};
+
+} // namespace kareport

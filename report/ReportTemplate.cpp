@@ -1,0 +1,77 @@
+#include "ReportTemplate.h"
+
+#include "Folders.h"
+
+#include <QDir>
+
+namespace kareport
+{
+
+namespace
+{
+
+QString fileIn(QString folder, const QString &fileName)
+{
+    if (!folder.endsWith(u'/') && !folder.endsWith(QDir::separator())) {
+        folder += QDir::separator();
+    }
+    return folder + fileName;
+}
+
+} // namespace
+
+bool ReportTemplate::load(const QString &fileName, const QString &templateName, const QString &tableName,
+                          const QString &blockName)
+{
+    // The handles point into the template that goes: they go with it.
+    table_.reset();
+    block_.reset();
+    template_ = std::make_unique<UXmlReportTpl>();
+    if (!template_->LoadTemplate(fileIn(GetLibraryDir(false), fileName), templateName) &&
+        !template_->LoadTemplate(fileIn(GetStartPathName(), fileName), templateName))
+    {
+        return false;
+    }
+    pageBreaks = template_->GetPageBreakXmlOption();
+    // The option is a signed 8-bit character and is widened with its sign.
+    separator =
+        static_cast<char16_t>(static_cast<qint16>(static_cast<signed char>(template_->GetSeparatorXmlOption())));
+    return (tableName.isEmpty() || loadTable(tableName)) && (blockName.isEmpty() || loadBlock(blockName));
+}
+
+bool ReportTemplate::loadTable(const QString &name)
+{
+    table_.reset();
+    if (!template_) {
+        return false;
+    }
+    auto table = std::make_unique<UXmlReportTable>();
+    table->SetColumnSeparator(static_cast<char>(separator & 0xFF));
+    if (!table->LoadTable(name, template_.get())) {
+        return false;
+    }
+    if (template_->SetNorthEastTableFieldOrder(name, static_cast<ORIENTATION_ORDER>(settings.northEastOrder))) {
+        table->ReorderingHeading();
+    }
+    if (!table->IsLoaded()) {
+        return false;
+    }
+    table_ = std::move(table); // not before it is whole: what cannot be loaded is not written either
+    return true;
+}
+
+bool ReportTemplate::loadBlock(const QString &name)
+{
+    block_.reset();
+    if (!template_) {
+        return false;
+    }
+    auto block = std::make_unique<UXmlReportBlock>();
+    if (!block->LoadBlock(name, template_.get())) {
+        return false;
+    }
+    block_ = std::move(block);
+    return true;
+}
+
+} // namespace kareport

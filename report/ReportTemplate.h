@@ -1,0 +1,50 @@
+#pragma once
+
+#include "FieldFormatter.h"
+#include "UJobSettings.h"
+#include "UXmlReportBlock.h"
+#include "UXmlReportTable.h"
+#include "UXmlReportTpl.h"
+
+#include <QString>
+
+#include <memory>
+
+namespace kareport
+{
+
+/// The template that a report's data is written through, with one table and one block of it, and what the texts of the
+/// values depend on besides their fields.
+///
+/// The functions throw `std::bad_alloc` when memory ends. What a failed load was to replace is gone.
+class ReportTemplate
+{
+public:
+    UJobSettings settings;
+    char16_t separator = u' ';            ///< between columns; a template that is loaded brings its own
+    bool pageBreaks = true;               ///< the option of the template that was loaded last
+    bool zeroBlank = false;               ///< values of zero show as blanks
+    static inline bool printHash = false; ///< values wider than their column show as "#": one setting for all reports
+
+    /// Loads a template from a file of the library folder or, failing that, of the start folder, and then the table and the
+    /// block unless their names are empty. @return false when one of them cannot be loaded
+    bool load(const QString &fileName, const QString &templateName, const QString &tableName, const QString &blockName);
+    /// Loads a table, or a block, of the template. @return false without a template, or when it has none of the name
+    bool loadTable(const QString &name);
+    bool loadBlock(const QString &name);
+
+    // Null where none is loaded.
+    const UXmlReportTpl *loaded() const { return template_.get(); }
+    const UXmlReportTable *table() const { return table_.get(); }
+    const UXmlReportBlock *block() const { return block_.get(); }
+
+    /// How values become texts. It points into this object.
+    FormatOptions formatOptions() const { return {&settings, separator, zeroBlank, printHash}; }
+
+private:
+    std::unique_ptr<UXmlReportTpl> template_;
+    std::unique_ptr<UXmlReportTable> table_; ///< a handle into the template, as the block is
+    std::unique_ptr<UXmlReportBlock> block_;
+};
+
+} // namespace kareport
