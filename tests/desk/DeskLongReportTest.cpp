@@ -1,5 +1,5 @@
+#include "ActivePaneFixture.h"
 #include "DeskFixture.h"
-
 #include "FrameFixture.h"
 #include "Recovery.h"
 #include "ReportCommandIds.h"
@@ -42,11 +42,6 @@ template <typename Act>
 void meanwhile(Act act)
 {
     QTimer::singleShot(0, act);
-}
-
-kareport::ReportEdit &editOf(const UReportDoc &report)
-{
-    return dynamic_cast<UReportView *>(report.GetViews().front())->GetEdit();
 }
 
 bool isShownWhole(const UReportDoc &report)

@@ -1,5 +1,6 @@
 #include "ReplaceFile.h"
 
+#include "FrameFixture.h"
 #include "PosixFileSizeLimit.h"
 #include "ReportFixture.h"
 
@@ -16,12 +17,6 @@
 
 namespace
 {
-
-std::string contentOf(const QString &path)
-{
-    QFile file(path);
-    return file.open(QIODevice::ReadOnly) ? file.readAll().toStdString() : "(cannot be read)";
-}
 
 QString reportWithOldContent(const QTemporaryDir &folder)
 {

@@ -1,3 +1,4 @@
+#include "FrameFixture.h"
 #include "ReportFixture.h"
 
 #include <QDir>
@@ -8,19 +9,6 @@
 
 namespace
 {
-
-std::string contentOf(const QString &path)
-{
-    QFile file(path);
-    return file.open(QIODevice::ReadOnly) ? file.readAll().toStdString() : "(cannot be read)";
-}
-
-void put(const QString &path, const QByteArray &content)
-{
-    QFile file(path);
-    ASSERT_TRUE(file.open(QIODevice::WriteOnly));
-    file.write(content);
-}
 
 TEST(UReportDocSave, AnEmptyReportSavesNoFileAndIsUnmodified)
 {
@@ -33,7 +21,7 @@ TEST(UReportDocSave, AnEmptyReportSavesNoFileAndIsUnmodified)
     EXPECT_FALSE(report.IsModified());
     EXPECT_FALSE(QFile::exists(path));
 
-    put(path, "earlier");
+    putFile(path, "earlier");
     report.SetModifiedFlag(true);
     EXPECT_TRUE(report.OnSaveDocument(path));
     EXPECT_FALSE(report.IsModified());
@@ -85,7 +73,7 @@ TEST(UReportDocSave, AFailedSaveKeepsTheModifiedFlagAndTheEarlierFile)
     const FixedSurroundings surroundings;
     const QTemporaryDir folder;
     const QString earlier = folder.filePath(QStringLiteral("a.rep"));
-    put(earlier, "earlier");
+    putFile(earlier, "earlier");
     ASSERT_TRUE(QDir().mkdir(folder.filePath(QStringLiteral("folder"))));
     UReportDoc report;
     report.WriteLine(QStringLiteral("x"), 0, 1, 0);
