@@ -1,4 +1,4 @@
-#include "ReportFileReader.h"
+#include "ByteLineReader.h"
 #include "ReportTextCodec.h"
 #include "ReportTextDecoder.h"
 
@@ -24,11 +24,11 @@ void checkPieces(const QByteArray &bytes)
     QBuffer file;
     file.setData(bytes);
     file.open(QIODevice::ReadOnly);
-    kareport::ReportFileReader reader(file);
+    kareport::ByteLineReader reader(file);
     QString all;
     while (reader.next()) {
         const QLatin1StringView piece = reader.piece();
-        expect(!piece.isEmpty() && piece.size() <= kareport::ReportFileReader::longestPiece);
+        expect(!piece.isEmpty() && piece.size() <= kareport::ByteLineReader::longestPiece);
         expect(piece.indexOf(u'\n') < 0 || piece.indexOf(u'\n') == piece.size() - 1);
         all += piece;
     }

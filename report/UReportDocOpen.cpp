@@ -1,8 +1,8 @@
 #include "UReportDoc.h"
 
 #include "AppMessageBox.h"
+#include "ByteLineReader.h"
 #include "MemoryLasts.h"
-#include "ReportFileReader.h"
 #include "ReportGuards.h"
 #include "ReportParts.h"
 #include "RichTextReader.h"
@@ -39,7 +39,7 @@ bool holdsRichText(const QString &path)
 /// Writes the lines of a file. @return whether they are the source of a rich-text document
 bool readLines(QIODevice &file, kareport::PageWriter &page, bool mayBeRichText, bool keepLineEnds)
 {
-    kareport::ReportFileReader reader(file);
+    kareport::ByteLineReader reader(file);
     bool isRichText = false;
     bool isFirst = true;
     bool isOpen = false;

@@ -141,7 +141,7 @@ private:
             visibleLine(text_.sliced(at, lineEnd - at), visible);
             ++lineNumber_;
             if (!typesetter_.coversAll()) {
-                typesetter_.findMissing(visible, [this](char32_t character) { noteMissing(character); });
+                typesetter_.prepare(visible, [this](char32_t character) { noteMissing(character); });
             }
             if (notes_.broken.count > 0) {
                 breakLine(

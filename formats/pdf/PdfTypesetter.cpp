@@ -75,7 +75,7 @@ FaceHeight PdfTypesetter::height() const
     return {box.top, box.bottom};
 }
 
-void PdfTypesetter::findMissing(QStringView line, const std::function<void(char32_t)> &isMissing)
+void PdfTypesetter::prepare(QStringView line, const std::function<void(char32_t)> &isMissing)
 {
     if (isPlain(line)) {
         return;

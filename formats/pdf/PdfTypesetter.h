@@ -34,8 +34,9 @@ public:
     int cell() const { return cell_; }
     /// Whether a face has every character of the text.
     bool coversAll() const { return coversAll_; }
-    /// Tells the characters of a line that no face has.
-    void findMissing(QStringView line, const std::function<void(char32_t)> &isMissing);
+    /// Embeds the faces and notes the glyphs that a line needs beyond those of `begin`, and tells the characters that no
+    /// face has.
+    void prepare(QStringView line, const std::function<void(char32_t)> &isMissing);
 
     /// Adds a page with these lines, which fit its box. @return false after an error
     bool addPage(const PdfPageBox &box, const LinePlacement &placement, std::span<const QStringView> lines);

@@ -7,7 +7,7 @@
 #include "RichTextReader.h"
 #include "RichTextState.h"
 #include "RichTextTokens.h"
-#include "RichTextWords.h"
+#include "RichTextWordTable.h"
 
 #include <QByteArray>
 

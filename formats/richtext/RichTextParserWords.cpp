@@ -29,16 +29,14 @@ void RichTextParser::readWord(const RichTextToken &token, bool isStarred)
         if (isStarred) {
             skipGroup(nullptr);
         }
-    } else if (isDestination(word->action)) {
-        readDestination(*word);
-    } else if (word->action >= RichTextAction::CodePage) {
-        readFontWord(word->action, word->value, token);
-    } else if (word->action >= RichTextAction::ParagraphDefaults) {
-        readParagraphWord(word->action, word->value, token);
-    } else if (word->action >= RichTextAction::Plain) {
-        readCharacterWord(word->action, word->value, token);
-    } else {
-        readTextWord(word->action, word->value, token);
+        return;
+    }
+    switch (subjectOf(word->action)) {
+    case RichTextSubject::Text: readTextWord(word->action, word->value, token); break;
+    case RichTextSubject::Characters: readCharacterWord(word->action, word->value, token); break;
+    case RichTextSubject::Paragraphs: readParagraphWord(word->action, word->value, token); break;
+    case RichTextSubject::File: readFontWord(word->action, word->value, token); break;
+    case RichTextSubject::Group: readDestination(*word); break;
     }
 }
 
@@ -87,7 +85,7 @@ void RichTextParser::readTextWord(RichTextAction action, int value, const RichTe
         break;
     }
     case RichTextAction::SamePage:
-        // Said of a section behind its beginning.
+        // Said of a section after its beginning.
         pageBreak_ = pageBreak_ && !sectionBreak_;
         break;
     default: break;

@@ -1,4 +1,4 @@
-#include "ReportFileReader.h"
+#include "ByteLineReader.h"
 
 #include <QIODevice>
 
@@ -15,7 +15,7 @@ constexpr qsizetype chunkSize = 256 * 1024;
 
 } // namespace
 
-void ReportFileReader::fill()
+void ByteLineReader::fill()
 {
     // A whole piece with its line end is looked at together.
     while (!atEnd_ && bytes_.size() - at_ < longestPiece + 1) {
@@ -29,7 +29,7 @@ void ReportFileReader::fill()
     }
 }
 
-bool ReportFileReader::next()
+bool ByteLineReader::next()
 {
     fill();
     const qsizetype available = std::min(bytes_.size() - at_, longestPiece + 1);

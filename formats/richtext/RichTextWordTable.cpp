@@ -1,4 +1,4 @@
-#include "RichTextWords.h"
+#include "RichTextWordTable.h"
 
 #include "RichTextState.h"
 

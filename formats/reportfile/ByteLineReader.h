@@ -10,15 +10,16 @@ class QIODevice;
 namespace kareport
 {
 
-/// Reads a text file in lines as a document loads it: one character a byte, CR LF as LF, and lines of more than 1022
-/// characters in pieces.
-class KAREPORT_EXPORT ReportFileReader
+/// Reads a text file in lines as `UReportDoc::LoadFile` takes them: one character a byte, whatever the bytes mean, CR LF as
+/// LF, and lines of more than 1022 characters in pieces. What reads a saved report back as the text that it was is
+/// `decodeReportText`.
+class KAREPORT_EXPORT ByteLineReader
 {
 public:
     static constexpr qsizetype longestPiece = 1022;
 
     /// The device must be open and live as long as the reader.
-    explicit ReportFileReader(QIODevice &device) : device_(device) {}
+    explicit ByteLineReader(QIODevice &device) : device_(device) {}
 
     /// Reads a line with its LF, or the next piece of a long one. @return false at the end of the file
     bool next();

@@ -1,4 +1,4 @@
-#include "ReportFileReader.h"
+#include "ByteLineReader.h"
 
 #include "PrintQt.h"
 
@@ -12,12 +12,12 @@
 namespace
 {
 
-using kareport::ReportFileReader;
+using kareport::ByteLineReader;
 
 QStringList piecesOf(QIODevice &device)
 {
     QStringList pieces;
-    ReportFileReader reader(device);
+    ByteLineReader reader(device);
     while (reader.next()) {
         pieces.append(reader.piece().toString());
     }
@@ -34,7 +34,7 @@ QStringList piecesOf(const QByteArray &bytes)
     return piecesOf(buffer);
 }
 
-TEST(ReportFileReader, ReadsLinesWithTheirLineFeed)
+TEST(ByteLineReader, ReadsLinesWithTheirLineFeed)
 {
     struct Row
     {
@@ -60,7 +60,7 @@ TEST(ReportFileReader, ReadsLinesWithTheirLineFeed)
     }
 }
 
-TEST(ReportFileReader, LongLinesComeInPieces)
+TEST(ByteLineReader, LongLinesComeInPieces)
 {
     const auto x = [](int count) { return QByteArray(count, 'x'); };
     const auto piece = [](int count, const char *end = "") { return QString(count, u'x') + QLatin1String(end); };
@@ -107,7 +107,7 @@ QStringList expectedPieces(QByteArray bytes)
     return pieces;
 }
 
-TEST(ReportFileReader, LinesAreWholeWhereverTheyStandInTheFile)
+TEST(ByteLineReader, LinesAreWholeWhereverTheyStandInTheFile)
 {
     // Bytes are taken from the device in chunks: line ends stand before, on and behind the places where one ends.
     for (const int chunk : {256 * 1024, 2 * 256 * 1024}) {
@@ -122,7 +122,7 @@ TEST(ReportFileReader, LinesAreWholeWhereverTheyStandInTheFile)
     }
 }
 
-TEST(ReportFileReader, ReadsAnyMixtureOfLineEnds)
+TEST(ByteLineReader, ReadsAnyMixtureOfLineEnds)
 {
     std::mt19937 random(1);
     for (int round = 0; round < 300; ++round) {
@@ -165,7 +165,7 @@ private:
     qint64 at_ = 0;
 };
 
-TEST(ReportFileReader, ADeviceMayGiveFewerBytesThanAskedFor)
+TEST(ByteLineReader, ADeviceMayGiveFewerBytesThanAskedFor)
 {
     const QByteArray bytes = "a\r\n" + QByteArray(1500, 'x') + "\r\r\nb\r\n\r\n" + QByteArray(1022, 'y') + "\r\nc";
     for (const qint64 atATime : {1, 2, 3, 1021, 1022, 1023}) {
