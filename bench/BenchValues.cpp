@@ -54,7 +54,7 @@ void formatField(benchmark::State &state)
         kareport::endWideVectors(); // as before each row
         out.clear();
         value = nextValue(value);
-        formatter.append(out, options, 8, &value, QStringView());
+        formatter.append(out, options, kareport::ValueKind::Double, &value, QStringView());
         benchmark::DoNotOptimize(out.view().utf16());
     }
     state.SetItemsProcessed(state.iterations());

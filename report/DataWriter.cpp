@@ -46,7 +46,7 @@ void DataWriter::writeBlock(const UXmlReportBlock &block, const UDataObject &obj
         row_.append(field.Label);
         row_.append(options_.separator);
         const std::size_t start = row_.size();
-        formatter.append(row_, options_, entry->GetKind(), entry->GetData(), QStringView());
+        formatter.append(row_, options_, entry->kind(), entry->GetData(), QStringView());
         row_.trim(start);
         if (!page_.losesNothing([this] { page_.writeLine(row_.view(), 0, 1, 0); })) {
             break;
@@ -127,13 +127,13 @@ void DataWriter::formatRow(const std::vector<FieldFormatter> &fields, const UDat
         switch (field.marker()) {
         case FieldMarker::SuffixR: suffix = u"R"; continue;
         case FieldMarker::SuffixPlus: suffix = u"+"; continue;
-        case FieldMarker::Filler: field.append(row_, options_, 0, nullptr, suffix); break;
+        case FieldMarker::Filler: field.append(row_, options_, ValueKind::None, nullptr, suffix); break;
         case FieldMarker::None: {
             const UDictEntry *entry = object.Find(field.id());
             if (entry != nullptr) {
-                field.append(row_, options_, entry->GetKind(), entry->GetData(), suffix);
+                field.append(row_, options_, entry->kind(), entry->GetData(), suffix);
             } else {
-                field.append(row_, options_, 0, nullptr, suffix);
+                field.append(row_, options_, ValueKind::None, nullptr, suffix);
             }
             row_.append(options_.separator);
             break;

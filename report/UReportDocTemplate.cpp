@@ -54,7 +54,8 @@ QString UReportDoc::FormatXmlStringToDisplay(const sXmlReportField *field, int k
     // A column of a template may be wider than there is memory.
     return kareport::whileMemoryLasts(QString(), [&] {
         kareport::TextBuffer text;
-        kareport::FieldFormatter(*field).append(text, parts_->data.formatOptions(), kind, value, offsetStyle);
+        kareport::FieldFormatter(*field).append(text, parts_->data.formatOptions(),
+                                                static_cast<kareport::ValueKind>(kind), value, offsetStyle);
         return text.view().toString();
     });
 }

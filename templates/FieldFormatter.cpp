@@ -24,16 +24,16 @@ struct FieldFormatter::Input
     double number = 0;
     QStringView text;
 
-    Input(int kind, const void *value)
+    Input(ValueKind kind, const void *value)
     {
-        switch (value != nullptr ? kind : 0) {
-        case 1: flag = *static_cast<const quint8 *>(value) != 0; break;
-        case 2: integer = *static_cast<const qint16 *>(value); break;
-        case 4: integer = *static_cast<const qint32 *>(value); break;
-        case 8: number = *static_cast<const double *>(value); break;
-        case 16: text = *static_cast<const QString *>(value); break;
-        case 32: text = static_cast<const UPointNumber *>(value)->Convert(); break;
-        default: break;
+        switch (value != nullptr ? kind : ValueKind::None) {
+        case ValueKind::Boolean: flag = *static_cast<const quint8 *>(value) != 0; break;
+        case ValueKind::Int16: integer = *static_cast<const qint16 *>(value); break;
+        case ValueKind::Int32: integer = *static_cast<const qint32 *>(value); break;
+        case ValueKind::Double: number = *static_cast<const double *>(value); break;
+        case ValueKind::Text: text = *static_cast<const QString *>(value); break;
+        case ValueKind::PointNumber: text = static_cast<const UPointNumber *>(value)->Convert(); break;
+        case ValueKind::None: break;
         }
     }
 };
@@ -60,7 +60,7 @@ FieldFormatter::FieldFormatter(const sXmlReportField &field)
       id_(static_cast<quint32>(field.ID))
 {}
 
-void FieldFormatter::append(TextBuffer &out, const FormatOptions &options, int kind, const void *value,
+void FieldFormatter::append(TextBuffer &out, const FormatOptions &options, ValueKind kind, const void *value,
                             QStringView suffix) const
 {
     if (marker_ == FieldMarker::Filler) {
@@ -68,7 +68,7 @@ void FieldFormatter::append(TextBuffer &out, const FormatOptions &options, int k
         return;
     }
     Input input(kind, value);
-    if (kind == 8 && std::isfinite(input.number)) {
+    if (kind == ValueKind::Double && std::isfinite(input.number)) {
         input.number = options.settings->ConvertToDisplay(input.number, type_, 0);
     }
     const std::size_t start = out.size();
@@ -130,12 +130,11 @@ void FieldFormatter::appendValue(TextBuffer &out, const FormatOptions &options, 
     case VARIABLE_DISTANCE:
     case VARIABLE_ELEVATION:
         if (finite && !blankForZero(input.number == 0)) {
-            settings.appendUnitLength(out, input.number, false, false, -1, width_, false);
+            settings.appendUnitLength(out, input.number, {.width = width_});
         }
         break;
     case VARIABLE_STATION:
-        settings.appendStation(out, input.number, false, false, false, -1, width_, false, false, false, true, false,
-                               true);
+        settings.appendStation(out, input.number, {.width = width_, .alignRight = true, .showSign = true});
         break;
     case VARIABLE_OFFSET:
         if (finite) {
@@ -186,15 +185,15 @@ void FieldFormatter::appendOffset(TextBuffer &out, const UJobSettings &settings,
     if (withSign) {
         const std::size_t start = out.size();
         out.append(value < 0 ? u'-' : u'+');
-        settings.appendUnitLength(out, magnitude, false, false, decimals_, -1, false);
+        settings.appendUnitLength(out, magnitude, {.decimals = decimals_});
         out.pad(start, width_);
         return;
     }
     if (Is_Zero(value)) {
-        settings.appendUnitLength(out, magnitude, false, false, decimals_, width_, false);
+        settings.appendUnitLength(out, magnitude, {.decimals = decimals_, .width = width_});
         return;
     }
-    settings.appendUnitLength(out, magnitude, false, false, decimals_, std::max(width_, 0) - 1, false);
+    settings.appendUnitLength(out, magnitude, {.decimals = decimals_, .width = std::max(width_, 0) - 1});
     out.append(value < 0 ? u'L' : u'R');
 }
 

@@ -4,6 +4,7 @@
 #include "KaReportExport.h"
 #include "TextBuffer.h"
 #include "UJobSettings.h"
+#include "ValueKind.h"
 #include "sXmlReportField.h"
 
 #include <QStringView>
@@ -11,7 +12,7 @@
 namespace kareport
 {
 
-/// What the formatting of a value depends on beside its field.
+/// What the formatting of a value depends on besides its field.
 struct FormatOptions
 {
     const UJobSettings *settings = nullptr;
@@ -30,10 +31,10 @@ public:
     quint32 id() const { return id_; }
 
     /// Appends a value's text, fitted to the field's column.
-    /// @param kind    what `value` points to: 1 a byte that is 0 or not, 2 a qint16, 4 a qint32, 8 a double in internal units, 16 a
-    ///                QString, 32 a UPointNumber; any other kind counts as 0, false or an empty text
-    /// @param suffix  "+" shows an offset with its sign, anything else with "L" or "R" behind it
-    void append(TextBuffer &out, const FormatOptions &options, int kind, const void *value, QStringView suffix) const;
+    /// @param kind    what `value` points to; `None` and any other number count as 0, false or an empty text
+    /// @param suffix  "+" shows an offset with its sign, anything else with "L" or "R" after it
+    void append(TextBuffer &out, const FormatOptions &options, ValueKind kind, const void *value,
+                QStringView suffix) const;
 
 private:
     enum class Align

@@ -1,8 +1,10 @@
 #include "UnitsPage.h"
 
 #include "PlainWidgets.h"
+#include "TextBuffer.h"
 #include "UFormatAngle.h"
 #include "UFormatBearing.h"
+#include "VariableType.h"
 #include "Xlate.h"
 
 #include <QCheckBox>
@@ -184,21 +186,14 @@ void UnitsPage::showSamples()
         .ConvertToDisplayString(sampleBearing, bearing);
     UFormatAngle::ConvertToDMSformatString(chosen.angleMarks[0], chosen.angleMarks[1], chosen.angleMarks[2], bearing);
     const auto number = [&chosen](double value) { return QString::number(value, 'f', chosen.numberDecimals); };
-    constexpr int angleKind = 3;
-    constexpr int areaKind = 11;
-    const QStringList rows = {
-        Xlate("Length"),
-        chosen.UnitLengthToString(sampleLength, true, true, -1, -1, false),
-        Xlate("Area"),
-        number(chosen.ConvertToDisplay(sampleArea, areaKind, 0)),
-        Xlate("Angle"),
-        number(chosen.ConvertToDisplay(sampleAngle, angleKind, 0)),
-        Xlate("Station"),
-        chosen.StationToString(sampleStation, true, false, false, -1, -1, false, false, false, false, false, false),
-        Xlate("Bearing"),
-        bearing,
-        Xlate("Columns"),
-        chosen.northEastOrder == 0 ? Xlate("E, N") : Xlate("N, E")};
+    kareport::TextBuffer station;
+    chosen.appendStation(station, sampleStation, {.fromInternal = true});
+    const QStringList rows = {Xlate("Length"),  chosen.UnitLengthToString(sampleLength, true, true, -1, -1, false),
+                              Xlate("Area"),    number(chosen.ConvertToDisplay(sampleArea, VARIABLE_AREA, 0)),
+                              Xlate("Angle"),   number(chosen.ConvertToDisplay(sampleAngle, VARIABLE_ANGLE, 0)),
+                              Xlate("Station"), station.view().toString(),
+                              Xlate("Bearing"), bearing,
+                              Xlate("Columns"), chosen.northEastOrder == 0 ? Xlate("E, N") : Xlate("N, E")};
     QString text;
     for (qsizetype i = 0; i + 1 < rows.size(); i += 2) {
         text += rows[i] + u'\n' + QStringLiteral("  ") + rows[i + 1] + u'\n';

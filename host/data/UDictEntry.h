@@ -1,9 +1,12 @@
 #pragma once
 
 #include "UPointNumber.h"
+#include "ValueKind.h"
 
 #include <QString>
 
+#include <cstddef>
+#include <type_traits>
 #include <variant>
 
 /// A value of a data object with the number that says what kind it is.
@@ -18,7 +21,8 @@ public:
     unsigned GetId() const { return id_; }
     /// What `GetData` points to: 1 a boolean byte, 2 a 16-bit integer, 4 a 32-bit integer, 8 a double, 16 a `QString`,
     /// 32 a `UPointNumber`.
-    int GetKind() const { return 1 << value_.index(); }
+    int GetKind() const { return static_cast<int>(kind()); }
+    kareport::ValueKind kind() const { return static_cast<kareport::ValueKind>(1 << value_.index()); }
     /// The value itself; valid as long as the entry is not changed.
     const void *GetData() const
     {
@@ -32,3 +36,17 @@ private:
     unsigned id_;
     Value value_;
 };
+
+namespace kareport
+{
+
+/// Whether the kind of an entry, which is made of the place of its type among those of the variant, is that of the type.
+template <typename Type, std::size_t place, ValueKind kind>
+constexpr bool isKindOf =
+    std::is_same_v<std::variant_alternative_t<place, UDictEntry::Value>, Type> && 1 << place == static_cast<int>(kind);
+
+static_assert(isKindOf<bool, 0, ValueKind::Boolean> && isKindOf<qint16, 1, ValueKind::Int16> &&
+              isKindOf<qint32, 2, ValueKind::Int32> && isKindOf<double, 3, ValueKind::Double> &&
+              isKindOf<QString, 4, ValueKind::Text> && isKindOf<UPointNumber, 5, ValueKind::PointNumber>);
+
+} // namespace kareport

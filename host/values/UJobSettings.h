@@ -8,9 +8,39 @@
 
 #include <array>
 
+namespace kareport
+{
+
+/// How a length becomes a text.
+struct LengthForm
+{
+    bool fromInternal =
+        false;             ///< the value is in metres and is converted first; otherwise it is in the shown unit already
+    bool withUnit = false; ///< a blank and the unit's symbol follow
+    int decimals = -1;     ///< -1 takes `UJobSettings::lengthDecimals`
+    int width = -1;        ///< blanks are put before a shorter text; -1 for none
+    bool blankZero = false; ///< a text whose digits are all 0 becomes ""
+};
+
+/// How a station becomes a text.
+struct StationForm
+{
+    bool fromInternal = false; ///< the value is in metres and is converted first
+    bool withUnit = false;     ///< a blank and the unit's symbol follow
+    bool plain = false;        ///< without the plus, whatever the station format
+    int decimals = -1;         ///< -1 takes `UJobSettings::stationDecimals`
+    int width = -1;            ///< the text is filled with blanks to this width
+    bool blankZero = false;    ///< a text without a digit other than 0 becomes ""
+    bool alignRight = false;   ///< blanks go before the text, otherwise after it
+    bool trimZeros = false;    ///< trailing zeros of the fraction go, and the point with the last of them
+    bool showSign = false;     ///< a value below zero gets "-" in front, unless only zeros are shown
+};
+
+} // namespace kareport
+
 /// The user's units and display formats. A value class: a report keeps its own copy.
 ///
-/// The functions whose names begin with `append` write behind what a buffer holds, without an allocation; those that
+/// The functions whose names begin with `append` write after what a buffer holds, without an allocation; those that
 /// return a text are the same with a buffer of their own.
 class KAREPORT_EXPORT UJobSettings
 {
@@ -42,38 +72,24 @@ public:
     std::array<char, 3> angleMarks = {'\xB0', '\'', '"'};
 
     /// Turns a value from its internal unit (metre, square metre, radian) into the unit it is shown in.
-    /// @param unitKind  the value type code: 5 to 10 a length, 11 an area, 3 and 18 an angle; any other is returned as it is
+    /// @param unitKind  the value type code (`VARIABLE_TYPE`): a value of a length, of an area or of an angle is turned, any other is
+    ///                  returned as it is
     /// @param reserved  0
     double ConvertToDisplay(double value, int unitKind, int reserved) const;
 
-    /// A length in fixed notation, never with a minus sign before zeros only; "" when it is not finite.
-    /// @param fromInternal  the value is in metres and is converted first; otherwise it is in the shown unit already
-    /// @param withUnit      a blank and the unit's symbol follow
-    /// @param decimals      -1 takes `lengthDecimals`
-    /// @param width         blanks are put before a shorter text; -1 for none
-    /// @param blankZero     a text whose digits are all 0 becomes ""
+    /// A length in fixed notation, never with a minus sign before zeros only; "" when it is not finite. The arguments are
+    /// those of `kareport::LengthForm`.
     QString UnitLengthToString(double value, bool fromInternal, bool withUnit, int decimals, int width,
                                bool blankZero) const;
-    void appendUnitLength(kareport::TextBuffer &out, double value, bool fromInternal, bool withUnit, int decimals,
-                          int width, bool blankZero) const;
+    void appendUnitLength(kareport::TextBuffer &out, double value, const kareport::LengthForm &form) const;
 
-    /// A station (chainage), such as 12+345.678; "" when it is not finite.
-    /// @param fromInternal  the value is in metres and is converted first
-    /// @param withUnit      a blank and the unit's symbol follow
-    /// @param plain         without the plus, whatever the station format
-    /// @param decimals      -1 takes `stationDecimals`
-    /// @param width         the text is filled with blanks to this width
+    /// A station (chainage), such as 12+345.678; "" when it is not finite. The arguments are those of
+    /// `kareport::StationForm`.
     /// @param withZone, withEquation  add nothing: the job has no zones and no station equations
-    /// @param blankZero     a text without a digit other than 0 becomes ""
-    /// @param alignRight    blanks go before the text, otherwise behind it
-    /// @param trimZeros     trailing zeros of the fraction go, and the point with the last of them
-    /// @param showSign      a value below zero gets "-" in front, unless only zeros are shown
     QString StationToString(double value, bool fromInternal, bool withUnit, bool plain, int decimals, int width,
                             bool withZone, bool withEquation, bool blankZero, bool alignRight, bool trimZeros,
                             bool showSign) const;
-    void appendStation(kareport::TextBuffer &out, double value, bool fromInternal, bool withUnit, bool plain,
-                       int decimals, int width, bool withZone, bool withEquation, bool blankZero, bool alignRight,
-                       bool trimZeros, bool showSign) const;
+    void appendStation(kareport::TextBuffer &out, double value, const kareport::StationForm &form) const;
 
 private:
     void appendUnit(kareport::TextBuffer &out) const;

@@ -10,46 +10,61 @@ namespace
 
 struct LengthRow
 {
+    LengthUnit unit;
     QStringView key;
     double metres;
     QStringView symbol;
 };
 
 constexpr std::array<LengthRow, 5> lengths = {{
-    {u"m", 1.0, u"m"},
-    {u"mm", 0.001, u"mm"},
-    {u"km", 1000.0, u"km"},
-    {u"ft", 0.3048, u"ft"},
-    {u"usft", 1200.0 / 3937.0, u"ft"},
+    {LengthUnit::Metre, u"m", 1.0, u"m"},
+    {LengthUnit::Millimetre, u"mm", 0.001, u"mm"},
+    {LengthUnit::Kilometre, u"km", 1000.0, u"km"},
+    {LengthUnit::InternationalFoot, u"ft", 0.3048, u"ft"},
+    {LengthUnit::UsSurveyFoot, u"usft", 1200.0 / 3937.0, u"ft"},
 }};
 
 struct AreaRow
 {
+    AreaUnit unit;
     QStringView key;
     double squareMetres;
 };
 
 constexpr std::array<AreaRow, 5> areas = {{
-    {u"m2", 1.0},
-    {u"ha", 10000.0},
-    {u"km2", 1000000.0},
-    {u"ft2", 0.09290304},
-    {u"ac", 4046.8564224},
+    {AreaUnit::SquareMetre, u"m2", 1.0},
+    {AreaUnit::Hectare, u"ha", 10000.0},
+    {AreaUnit::SquareKilometre, u"km2", 1000000.0},
+    {AreaUnit::SquareFoot, u"ft2", 0.09290304},
+    {AreaUnit::Acre, u"ac", 4046.8564224},
 }};
 
 struct AngleRow
 {
+    AngleUnit unit;
     QStringView key;
     double perRadian;
 };
 
 constexpr std::array<AngleRow, 3> angles = {{
-    {u"deg", 180.0 / std::numbers::pi},
-    {u"gon", 200.0 / std::numbers::pi},
-    {u"rad", 1.0},
+    {AngleUnit::Degree, u"deg", 180.0 / std::numbers::pi},
+    {AngleUnit::Gon, u"gon", 200.0 / std::numbers::pi},
+    {AngleUnit::Radian, u"rad", 1.0},
 }};
 
-// The rows stand in the order of the enumerators.
+/// Whether each row stands at the place of its unit, where it is looked up.
+template <typename Rows>
+constexpr bool standInOrder(const Rows &rows)
+{
+    for (std::size_t i = 0; i < rows.size(); ++i) {
+        if (static_cast<std::size_t>(rows[i].unit) != i) {
+            return false;
+        }
+    }
+    return true;
+}
+static_assert(standInOrder(lengths) && standInOrder(areas) && standInOrder(angles));
+
 template <typename Unit, typename Rows>
 const typename Rows::value_type &rowOf(const Rows &rows, Unit unit)
 {
@@ -61,7 +76,7 @@ std::optional<Unit> unitFromKey(const Rows &rows, QStringView key)
 {
     for (std::size_t i = 0; i < rows.size(); ++i) {
         if (rows[i].key == key) {
-            return static_cast<Unit>(i);
+            return rows[i].unit;
         }
     }
     return std::nullopt;

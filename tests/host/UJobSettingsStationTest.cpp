@@ -58,8 +58,9 @@ void expectStations(const Row (&rows)[size])
         EXPECT_EQ(stationOf(settings, row, true, true), row.expected.toString()) << row.reason << ", with zone";
         TextBuffer out;
         out.append(u"before ");
-        settings.appendStation(out, row.value, row.fromInternal, row.withUnit, row.plain, row.decimals, row.width,
-                               false, false, row.blankZero, row.alignRight, row.trimZeros, row.showSign);
+        settings.appendStation(out, row.value,
+                               {row.fromInternal, row.withUnit, row.plain, row.decimals, row.width, row.blankZero,
+                                row.alignRight, row.trimZeros, row.showSign});
         EXPECT_EQ(out.view().toString(), QStringLiteral("before ") + row.expected.toString())
             << row.reason << ", appended";
     }

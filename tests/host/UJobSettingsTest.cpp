@@ -238,8 +238,8 @@ TEST(UJobSettings, UnitLengthToString)
             << row.reason;
         TextBuffer out;
         out.append(u"before ");
-        settings.appendUnitLength(out, row.value, row.fromInternal, row.withUnit, row.decimals, row.width,
-                                  row.blankZero);
+        settings.appendUnitLength(out, row.value,
+                                  {row.fromInternal, row.withUnit, row.decimals, row.width, row.blankZero});
         EXPECT_EQ(out.view().toString(), QStringLiteral("before ") + row.expected.toString())
             << row.reason << ", appended";
     }

@@ -15,7 +15,7 @@ QString FormattedField::of(int kind, const void *value) const
     used.settings = &settings;
     kareport::TextBuffer out;
     out.append(u"before");
-    kareport::FieldFormatter(field).append(out, used, kind, value, suffix);
+    kareport::FieldFormatter(field).append(out, used, static_cast<kareport::ValueKind>(kind), value, suffix);
     return out.from(0).startsWith(u"before") ? out.from(6).toString()
                                              : QStringLiteral("what stood there before was changed");
 }
