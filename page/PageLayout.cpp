@@ -2,6 +2,7 @@
 
 #include "Preferences.h"
 #include "Profile.h"
+#include "ReportMargins.h"
 #include "ReportOrientation.h"
 
 namespace kareport

@@ -1,8 +1,8 @@
 #pragma once
 
 #include "KaReportExport.h"
+#include "PageDefaults.h"
 #include "PageMeasurement.h"
-#include "ReportMargins.h"
 
 #include <QMargins>
 #include <QString>
@@ -19,8 +19,8 @@ class KAREPORT_EXPORT PageLayout
 public:
     /// Hundredths of a millimetre. What is measured changes by `measure` alone.
     QMargins margins = defaultMargins;
-    QString fontName = QStringLiteral("Lucida Console");
-    unsigned fontSize = 8; ///< points
+    QString fontName = defaultFace.toString();
+    unsigned fontSize = defaultFontSize; ///< points
 
     const PageGeometry &geometry() const { return geometry_; }
 

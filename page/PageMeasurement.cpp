@@ -1,6 +1,7 @@
 #include "PageMeasurement.h"
 
 #include "DefaultPrinter.h"
+#include "FixedPitchFont.h"
 
 #include <QFont>
 #include <QFontMetricsF>
@@ -23,7 +24,6 @@ namespace
 constexpr int hundredthsPerInch = 2540; // of a millimetre
 constexpr qreal millimetresPerInch = 25.4;
 constexpr int pointsPerInch = 72;
-constexpr qsizetype longestFaceName = 31;
 
 int clampToInt(qint64 value)
 {
@@ -116,13 +116,7 @@ std::optional<PageDevice> defaultPageDevice(bool portrait)
 
 FontExtents measureFont(const QString &face, unsigned points, int resolution)
 {
-    QFont font;
-    font.setFamilies({face.left(longestFaceName), QStringLiteral("DejaVu Sans Mono")});
-    font.setStyleHint(QFont::TypeWriter);
-    font.setFixedPitch(true);
-    // Whatever the application's own font is.
-    font.setWeight(QFont::Normal);
-    font.setItalic(false);
+    QFont font = fixedPitchFont(face.left(longestFaceName));
     font.setStretch(QFont::Unstretched);
     font.setHintingPreference(QFont::PreferNoHinting);
     font.setPixelSize(mulDiv(static_cast<int>(points), resolution, pointsPerInch));

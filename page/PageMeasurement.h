@@ -1,6 +1,7 @@
 #pragma once
 
 #include "KaReportExport.h"
+#include "PageDefaults.h"
 
 #include <QMargins>
 #include <QSize>
@@ -33,10 +34,10 @@ struct FontExtents
 /// Printed page of a report, measured once from a printer and a font.
 struct PageGeometry
 {
-    QSize pageSize = {0, 0}; ///< whole sheet, printer dots; (0, 0) until measured
-    unsigned resolution = 0; ///< vertical dots per inch; 0 until measured
-    int linesPerPage = 72;   ///< lines between the margins
-    int charsPerRow = 80;    ///< characters of average width between the margins
+    QSize pageSize = {0, 0};                ///< whole sheet, printer dots; (0, 0) until measured
+    unsigned resolution = 0;                ///< vertical dots per inch; 0 until measured
+    int linesPerPage = defaultLinesPerPage; ///< lines between the margins
+    int charsPerRow = defaultCharsPerRow;   ///< characters of average width between the margins
 };
 
 /// a × b / c, rounded to the nearest whole number, halves away from 0.

@@ -2,6 +2,7 @@
 
 #include "KaReportExport.h"
 #include "MemoryLasts.h"
+#include "PageDefaults.h"
 #include "PageStarts.h"
 #include "ReportText.h"
 #include "TextOutlet.h"
@@ -158,7 +159,7 @@ private:
     int lineNumber_ = 0;
     qint64 lineCount_ = 0; ///< a report that is handed on may have any number
     int pageNumber_ = 0;
-    int linesPerPage_ = 72;
+    int linesPerPage_ = defaultLinesPerPage;
     bool headerFlag_ = false;
     QString headerLine_;
     PageHeading heading_;

@@ -8,9 +8,6 @@
 namespace kareport
 {
 
-/// The margins of a report for which nobody has chosen others: left, top, right, bottom in hundredths of a millimetre.
-inline constexpr QMargins defaultMargins(1000, 1000, 1200, 2000);
-
 /// Page margins as the profile keeps them: left, top, right, bottom in hundredths of a millimetre, "%d, %d, %d, %d".
 KAREPORT_EXPORT QString marginsToText(const QMargins &margins);
 /// The margins of such a text. Numbers that are missing leave their margin as it is in `margins`; a piece without a

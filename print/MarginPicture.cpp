@@ -1,5 +1,6 @@
 #include "MarginPicture.h"
 
+#include "FixedPitchFont.h"
 #include "PageMeasurement.h"
 #include "PrintGeometry.h"
 
@@ -22,10 +23,7 @@ constexpr int farEnd = 10'000; // beyond every sheet
 /// A fixed-pitch font whose lines are `height` dots high.
 QFont markFont(QPaintDevice &device, int height)
 {
-    QFont font;
-    font.setFamilies({QStringLiteral("Courier New"), QStringLiteral("DejaVu Sans Mono")});
-    font.setStyleHint(QFont::TypeWriter);
-    font.setFixedPitch(true);
+    QFont font = fixedPitchFont(QStringLiteral("Courier New"));
     font.setPixelSize(std::max(1, height));
     const QFontMetricsF metrics(font, &device);
     const qreal line = metrics.ascent() + metrics.descent();

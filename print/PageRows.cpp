@@ -1,5 +1,7 @@
 #include "PageRows.h"
 
+#include "Characters.h"
+
 #include <QFontMetricsF>
 #include <QGlyphRun>
 #include <QPaintEngine>
@@ -21,18 +23,6 @@ namespace
 constexpr int pieceLength = 2000;
 /// Wider, in dots, than such a piece.
 constexpr qreal unbroken = 4e6;
-
-/// Characters that stand side by side as they come: no tab, nothing that combines or runs from right to left.
-bool isPlain(char16_t character)
-{
-    constexpr char16_t softHyphen = 0xAD;
-    return (character >= u' ' && character < 0x7F) ||
-           (character >= 0xA0 && character < 0x300 && character != softHyphen) ||
-           (character >= 0x370 && character < 0x483) ||   // Greek, Cyrillic
-           (character >= 0x2500 && character < 0x2600) || // frames and shapes
-           (character >= 0x3041 && character < 0x3097) || (character >= 0x30A1 && character < 0x30FF) ||
-           (character >= 0x3400 && character < 0xA000) || (character >= 0xAC00 && character < 0xD7A4);
-}
 
 } // namespace
 
@@ -100,7 +90,7 @@ qreal PageRows::plainWidth() const
             width += qreal(run.face->pitch) * run.length; // what has a glyph of its own is plain
             continue;
         }
-        if (!std::all_of(text.begin(), text.end(), [](QChar character) { return isPlain(character.unicode()); })) {
+        if (!std::all_of(text.begin(), text.end(), [](QChar character) { return standsAlone(character.unicode()); })) {
             return -1;
         }
         width += widthOf(run);

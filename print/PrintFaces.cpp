@@ -1,5 +1,7 @@
 #include "PrintFaces.h"
 
+#include "Characters.h"
+#include "FixedPitchFont.h"
 #include "PageMeasurement.h"
 
 #include <QFontInfo>
@@ -21,7 +23,6 @@ namespace
 
 constexpr int pointsPerInch = 72;
 constexpr qreal usualScreenResolution = 96;
-constexpr char16_t softHyphen = 0xAD;
 
 qreal screenResolution()
 {
@@ -51,8 +52,7 @@ void fillGlyphs(PrintFace &face)
 {
     QString characters;
     for (char16_t character = 0; character < face.glyphs.size(); ++character) {
-        const bool isPrinted = QChar(character).isPrint() && character != softHyphen;
-        characters += isPrinted ? QChar(character) : QChar(u' ');
+        characters += standsAlone(character) ? QChar(character) : QChar(u' ');
     }
     face.raw = QRawFont::fromFont(face.font);
     const QList<quint32> glyphs = face.raw.glyphIndexesForString(characters);
@@ -83,10 +83,7 @@ PrintFace PrintFaces::makeFace(const QFont &font, const QColor &color) const
     face.font = font;
     const bool fixedPitch = font.fixedPitch() || font.styleHint() == QFont::TypeWriter || QFontInfo(font).fixedPitch();
     if (fixedPitch) {
-        // What stands in for a face that is not installed is the same as where the page is measured.
-        face.font.setFamilies(font.families() + QStringList(QStringLiteral("DejaVu Sans Mono")));
-        face.font.setStyleHint(QFont::TypeWriter);
-        face.font.setFixedPitch(true);
+        setFixedPitch(face.font);
     }
     face.font.setHintingPreference(QFont::PreferNoHinting);
     const qreal size =

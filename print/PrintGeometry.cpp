@@ -51,7 +51,7 @@ int twipsOfMillimetres(qreal millimetres)
     return static_cast<int>(std::lround(millimetres * twipsPerInch / millimetresPerInch));
 }
 
-int pageCount(int lines, int linesPerPage)
+int expectedPages(int lines, int linesPerPage)
 {
     if (linesPerPage == 0) {
         return 0;

@@ -19,9 +19,10 @@ KAREPORT_EXPORT QSize twipsOfDots(const QSize &sheet, unsigned resolution);
 /// A length in millimetres as twips, rounded.
 KAREPORT_EXPORT int twipsOfMillimetres(qreal millimetres);
 
-/// The pages that so many lines take. @return 0 for a page without lines, and a number below 0 where the page has fewer
-/// than none: there is then no page either
-KAREPORT_EXPORT int pageCount(int lines, int linesPerPage);
+/// How many pages a print job is expected to have before it is laid out, by the lines that were written: what the print
+/// dialog begins with. How many there are is told by `reportPages`, and by the sheets of the job.
+/// @return 0 for a page without lines, and a number below 0 where the page has fewer than none: there is then no page either
+KAREPORT_EXPORT int expectedPages(int lines, int linesPerPage);
 
 /// What the margins leave of a sheet; a width or height below 0 where they leave nothing.
 KAREPORT_EXPORT QRect printableRect(const QSize &sheet, const QMargins &margins);

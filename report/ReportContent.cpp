@@ -1,5 +1,6 @@
 #include "ReportContent.h"
 
+#include "FixedPitchFont.h"
 #include "LineEndings.h"
 #include "UReportDoc.h"
 
@@ -10,13 +11,7 @@ namespace kareport
 
 QFont reportFont(const QString &name, unsigned points)
 {
-    // Where the face is missing, the nearest fixed-pitch one has to stand in: the system would take a proportional one.
-    QFont font(QStringList{name, QStringLiteral("DejaVu Sans Mono"), QStringLiteral("Liberation Mono")});
-    font.setStyleHint(QFont::TypeWriter);
-    font.setFixedPitch(true);
-    // Whatever the application's own font is.
-    font.setWeight(QFont::Normal);
-    font.setItalic(false);
+    QFont font = fixedPitchFont(name);
     if (points > 0) {
         font.setPointSize(static_cast<int>(points));
     }
@@ -25,7 +20,6 @@ QFont reportFont(const QString &name, unsigned points)
 
 QFont reportFont(const UReportDoc &report)
 {
-    constexpr qsizetype longestFaceName = 31;
     return reportFont(report.GetFontName().left(longestFaceName), report.GetFontSize());
 }
 

@@ -1,5 +1,7 @@
 #include "LineWidth.h"
 
+#include "Characters.h"
+
 #include <algorithm>
 #include <cmath>
 
@@ -9,40 +11,12 @@ namespace kareport
 namespace
 {
 
-constexpr qsizetype tabColumns = 8;
 /// Widths that are whole but for the rounding of a sum stay whole.
 constexpr qreal roundingError = 1e-3;
 
 constexpr bool isAscii(char16_t character)
 {
     return character >= 0x20 && character < 0x7F;
-}
-
-bool isShownAsItIs(char16_t character)
-{
-    return character >= 0x20 && character != 0x7F && (character < 0x80 || character > 0x9F) && character != 0x2028 &&
-           character != 0x2029;
-}
-
-/// Whether a character takes its place in a line whatever stands beside it: it is not joined, not stacked, not turned round
-/// and no half of a pair.
-constexpr bool standsAlone(char16_t character)
-{
-    struct Range
-    {
-        char16_t first;
-        char16_t last;
-    };
-    constexpr Range ranges[] = {
-        {0x00A0, 0x00AC}, {0x00AE, 0x02FF},                   // Latin
-        {0x0370, 0x0482}, {0x048A, 0x0523},                   // Greek, Cyrillic
-        {0x2010, 0x2027}, {0x2030, 0x205E}, {0x2070, 0x20CF}, // punctuation, signs of currency
-        {0x2100, 0x2BFF},                                     // symbols, arrows, box drawing
-        {0x2E80, 0x3029}, {0x3030, 0x3098}, {0x309B, 0x9FFF}, // Chinese, Japanese
-        {0xAC00, 0xD7A3}, {0xF900, 0xFAFF}, {0xFF01, 0xFF9D}, {0xFFA0, 0xFFEE},
-    };
-    return std::any_of(std::begin(ranges), std::end(ranges),
-                       [character](const Range &range) { return character >= range.first && character <= range.last; });
 }
 
 qreal pitchOf(const QFontMetricsF &metrics)
@@ -73,7 +47,7 @@ QString shownLine(QStringView line)
         if (character == u'\t') {
             shown += QString(tabColumns - shown.size() % tabColumns, u' ');
         } else {
-            shown += isShownAsItIs(character.unicode()) ? character : QChar(u' ');
+            shown += isControl(character.unicode()) ? QChar(u' ') : character;
         }
     }
     return shown;

@@ -1,6 +1,7 @@
 #include "UReportWindowDlg.h"
 
 #include "CReportToolBar.h"
+#include "PageDefaults.h"
 #include "ReportContent.h"
 #include "ReportResources.h"
 #include "ReportWindowBody.h"
@@ -18,10 +19,6 @@
 
 namespace
 {
-
-/// The font of a window that is not linked to a report yet.
-const QString reportFace = QStringLiteral("Lucida Console");
-constexpr unsigned reportPoints = 8;
 
 /// Saved under this name with the frame's layout.
 const QString dockName = QStringLiteral("reportWindow");
@@ -174,8 +171,9 @@ void UReportWindowDlg::SetReportDoc(UReportDoc *report)
     report_ = report;
     if (body_) {
         report = GetReportDoc();
-        body_->list().setFont(report != nullptr ? kareport::reportFont(*report)
-                                                : kareport::reportFont(reportFace, reportPoints));
+        body_->list().setFont(report != nullptr
+                                  ? kareport::reportFont(*report)
+                                  : kareport::reportFont(kareport::defaultFace.toString(), kareport::defaultFontSize));
         updateCommands();
     }
 }

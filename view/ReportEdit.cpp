@@ -1,5 +1,6 @@
 #include "ReportEdit.h"
 
+#include "Characters.h"
 #include "Xlate.h"
 
 #include <QKeyEvent>
@@ -24,7 +25,6 @@ namespace
 
 constexpr int zoomSteps[] = {25, 33, 50, 67, 75, 80, 90, 100, 110, 125, 150, 175, 200, 250, 300, 400, 500};
 constexpr int wheelStep = 120;
-constexpr int tabWidth = 8; // characters
 
 QTextDocument *newDocument(QWidget *parent, const QFont &font)
 {
@@ -343,7 +343,7 @@ void ReportEdit::applyZoom()
     // names as well as the report's own, and the distance of tab stops. That stays too: printing goes by it.
     QAbstractTextDocumentLayout *layout = document()->documentLayout();
     const bool wasZoomed = layout->paintDevice() != nullptr;
-    setTabStopDistance(tabWidth * QFontMetricsF(font()).horizontalAdvance(QLatin1Char('x')));
+    setTabStopDistance(kareport::tabColumns * QFontMetricsF(font()).horizontalAdvance(QLatin1Char('x')));
     if (zoom_ == 100) {
         layout->setPaintDevice(nullptr);
     } else {

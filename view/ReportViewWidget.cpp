@@ -2,6 +2,7 @@
 
 #include "FindBar.h"
 #include "PageBar.h"
+#include "PageDefaults.h"
 #include "PlainWidgets.h"
 #include "ReportChange.h"
 #include "ReportEdit.h"
@@ -24,8 +25,6 @@ namespace kareport
 
 namespace
 {
-
-constexpr int usualLinesPerPage = 72;
 
 /// Shows a text in a label that is as wide as the widest of its texts so far. A label of one size lays nothing out anew,
 /// neither here nor in the windows around it: that would happen at every key.
@@ -116,7 +115,7 @@ void ReportViewWidget::setLinesPerPage(std::function<int()> linesPerPage)
 
 int ReportViewWidget::linesPerPage() const
 {
-    return linesPerPage_ ? std::max(1, linesPerPage_()) : usualLinesPerPage;
+    return linesPerPage_ ? std::max(1, linesPerPage_()) : kareport::defaultLinesPerPage;
 }
 
 void ReportViewWidget::setPageStarts(std::function<std::vector<int>()> starts)

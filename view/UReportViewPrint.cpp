@@ -197,7 +197,7 @@ bool UReportView::OnPreparePrinting(PrintInfo &info)
     }
     GetEdit().finishLoading();
     m_sizePaper = kareport::twipsOfDots(report->GetPageSize(), report->GetPrintResolution());
-    info.maxPage = kareport::pageCount(report->GetLineCount(), report->GetLinesPerPage());
+    info.maxPage = kareport::expectedPages(report->GetLineCount(), report->GetLinesPerPage());
     m_rectMargin = kareport::twipsOfHundredths(report->GetMargins());
     if (info.printer == nullptr) {
         if (!kareport::hasReportPrinter()) {

@@ -1,6 +1,7 @@
 #include "DeskPreferences.h"
 
 #include "JobSettingsWriter.h"
+#include "PageDefaults.h"
 #include "Preferences.h"
 #include "Profile.h"
 #include "ReportMargins.h"
@@ -17,7 +18,6 @@ const QString settingsEntry = QStringLiteral("Job Settings");
 const QString marginsEntry = QStringLiteral("Report Margins");
 const QString keepEntry = QStringLiteral("KeepReportForEditor");
 const QString languageEntry = QStringLiteral("Language");
-constexpr QMargins usualMargins(1000, 1000, 1200, 2000);
 
 UJobSettings settingsFromText(const QString &text)
 {
@@ -47,7 +47,7 @@ DeskPreferences loadPreferences()
     DeskPreferences preferences;
     preferences.settings = settingsFromText(GetProfileString(QString(), settingsEntry));
     preferences.fontSize = GetReportFontSize();
-    preferences.margins = marginsFromText(GetProfileString(QString(), marginsEntry), usualMargins);
+    preferences.margins = marginsFromText(GetProfileString(QString(), marginsEntry), defaultMargins);
     preferences.portrait = IsReportPrinterSetToPortrait();
     preferences.usesEditor = GetUsePreferredReportEditorFlag() != 0;
     preferences.editor = GetProfileString(QString(), GetPreferredReportEditorRegKey());

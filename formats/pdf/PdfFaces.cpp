@@ -1,4 +1,5 @@
 #include "PdfFaces.h"
+#include "FixedPitchFont.h"
 
 #include <QDir>
 #include <QFile>
@@ -155,11 +156,12 @@ std::optional<PdfFace> preferredPdfFace(const QStringList &fontFolders)
 
 std::vector<PdfFace> fixedPitchPdfFaces()
 {
-    static constexpr const char *families[] = {"DejaVu Sans Mono", "Liberation Mono", "Hack", "WenQuanYi Zen Hei Mono",
-                                               "WenQuanYi Zen Hei"};
+    // The last two have the characters of Chinese and Japanese.
+    const QStringList families =
+        standInFaces() + QStringList{QStringLiteral("WenQuanYi Zen Hei Mono"), QStringLiteral("WenQuanYi Zen Hei")};
     std::vector<PdfFace> faces;
-    for (const char *family : families) {
-        if (auto face = faceOfFamily(family)) {
+    for (const QString &family : families) {
+        if (auto face = faceOfFamily(family.toLatin1().constData())) {
             faces.push_back(std::move(*face));
         }
     }

@@ -1,6 +1,7 @@
 #include "PdfText.h"
 
 #include "CharacterCells.h"
+#include "Characters.h"
 
 #include <QChar>
 
@@ -13,14 +14,6 @@ namespace kareport
 
 namespace
 {
-
-constexpr qsizetype tabWidth = 8;
-
-constexpr bool isControl(char16_t character)
-{
-    return character < 0x20 || (character >= 0x7F && character < 0xA0) || character == QChar::LineSeparator ||
-           character == QChar::ParagraphSeparator;
-}
 
 void removeBlanksAtEnd(QString &line)
 {
@@ -86,7 +79,7 @@ void visibleLine(QStringView line, QString &visible)
     for (qsizetype i = 0; i < line.size(); ++i) {
         const QChar character = line[i];
         if (character == u'\t') {
-            const qsizetype blanks = tabWidth - column % tabWidth;
+            const qsizetype blanks = tabColumns - column % tabColumns;
             visible.resize(visible.size() + blanks, u' ');
             column += blanks;
             continue;

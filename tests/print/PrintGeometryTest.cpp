@@ -93,7 +93,7 @@ TEST(PrintGeometry, CountsPages)
         {INT_MAX, 1, INT_MAX, "the most"},
     };
     for (const Row &row : rows) {
-        EXPECT_EQ(pageCount(row.lines, row.linesPerPage), row.pages) << row.reason;
+        EXPECT_EQ(expectedPages(row.lines, row.linesPerPage), row.pages) << row.reason;
     }
 }
 

@@ -4,6 +4,7 @@
 #include "DeskFrame.h"
 #include "FindBar.h"
 #include "PageBar.h"
+#include "PageDefaults.h"
 #include "PageSetupDialog.h"
 #include "PreferencesDialog.h"
 #include "PrintProgress.h"
@@ -131,7 +132,7 @@ void takeDialogs(Pictures &pictures, const QString &examples)
     fromTemplate.setTemplateFile(QDir(examples).filePath(QStringLiteral("data/control.csv")));
     pictures.take(fromTemplate, "template-wrong");
     kareport::PageSetup setup;
-    setup.margins = QMargins(1000, 1000, 1200, 2000);
+    setup.margins = kareport::defaultMargins;
     kareport::fillPrinters(setup);
     setup.printers = {QStringLiteral("Office"), QStringLiteral("Plotter")};
     kareport::PageSetupDialog pageSetup(setup);
