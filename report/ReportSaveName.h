@@ -3,6 +3,7 @@
 #include "KaReportExport.h"
 
 #include <QString>
+#include <QStringView>
 
 #include <optional>
 
@@ -14,6 +15,9 @@ namespace kareport
 /// The profile entry of the folder that a report was opened from or saved in last.
 inline const QString lastReportFolder = QStringLiteral("LastOpenDirectoryReport");
 
+/// Whether a file name ends with an extension (".rtf", in small letters), in any case. The first occurrence of the
+/// extension decides: a name that holds it earlier as well does not count as ending with it.
+KAREPORT_EXPORT bool endsWithExtension(QStringView name, QStringView extension);
 /// Asks for the name of a file to save a report in, beginning with the folder used last, and keeps its folder.
 /// @param richTextFirst  offers rich text before report text
 /// @return nothing when the user has cancelled

@@ -1,7 +1,6 @@
 #include "UReportDoc.h"
 
 #include "EditorHandOver.h"
-#include "FileExtension.h"
 #include "MemoryLasts.h"
 #include "PageHeader.h"
 #include "PdfExport.h"

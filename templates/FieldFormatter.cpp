@@ -47,6 +47,15 @@ std::size_t columnOf(qint32 width)
     return width > 0 ? static_cast<std::size_t>(width) : 0;
 }
 
+void appendInteger(TextBuffer &out, qint32 value, qint32 width)
+{
+    char digits[12];
+    const auto end = std::to_chars(std::begin(digits), std::end(digits), value).ptr;
+    const std::size_t start = out.size();
+    out.appendAscii({digits, static_cast<std::size_t>(end - digits)});
+    out.pad(start, width);
+}
+
 } // namespace
 
 FieldFormatter::FieldFormatter(const sXmlReportField &field)
@@ -98,11 +107,7 @@ void FieldFormatter::appendValue(TextBuffer &out, const FormatOptions &options, 
     switch (type_) {
     case VARIABLE_INTEGER:
         if (!blankForZero(input.integer == 0)) {
-            char digits[12];
-            const auto end = std::to_chars(std::begin(digits), std::end(digits), input.integer).ptr;
-            const std::size_t start = out.size();
-            out.appendAscii({digits, static_cast<std::size_t>(end - digits)});
-            out.pad(start, width_);
+            appendInteger(out, input.integer, width_);
         }
         break;
     case VARIABLE_DOUBLE:

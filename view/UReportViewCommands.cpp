@@ -21,6 +21,14 @@ Command editCommand(unsigned id, ReportEdit &edit, Act act, std::function<void(C
     return {id, [&edit, act] { (edit.*act)(); }, std::move(update)};
 }
 
+void closeReport(UReportDoc *report)
+{
+    if (report != nullptr && report->EnableCloseOption() && report->SaveModified() &&
+        UReportDoc::IsReportAvailable(report)) {
+        report->OnCloseDocument();
+    }
+}
+
 } // namespace
 
 const std::vector<Command> &UReportView::commands() const
@@ -69,15 +77,7 @@ std::vector<Command> UReportView::makeCommands()
          alwaysEnabled},
         editCommand(copyCommand, edit, &ReportEdit::copy, alwaysEnabled),
         editCommand(cutCommand, edit, &ReportEdit::cut, alwaysEnabled),
-        {fileCloseCommand,
-         [this] {
-             UReportDoc *report = GetDocument();
-             if (report != nullptr && report->EnableCloseOption() && report->SaveModified() &&
-                 UReportDoc::IsReportAvailable(report)) {
-                 report->OnCloseDocument();
-             }
-         },
-         closeState},
+        {fileCloseCommand, [this] { closeReport(GetDocument()); }, closeState},
         {closeBoxCommand, {}, closeState},
         // Whether there is something to paste is not asked here: another program may take its time to answer.
         editCommand(pasteCommand, edit, &ReportEdit::paste, alwaysEnabled),

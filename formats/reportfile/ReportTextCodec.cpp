@@ -60,6 +60,21 @@ char *writeCharacter(char *out, char32_t character)
     return out;
 }
 
+/// Copies whole runs of plain characters. @return how many characters these are
+template <typename Character>
+std::size_t copyPlainRuns(const Character *at, const Character *end, Character special, char *out)
+{
+    const Character *const begin = at;
+    while (static_cast<std::size_t>(end - at) >= runLength && isPlainRun(at, special)) {
+        for (std::size_t i = 0; i < runLength; ++i) {
+            out[i] = static_cast<char>(at[i]);
+        }
+        out += runLength;
+        at += runLength;
+    }
+    return static_cast<std::size_t>(at - begin);
+}
+
 } // namespace
 
 std::size_t ReportTextEncoder::encode(QStringView text, char *out, bool last)
@@ -104,14 +119,10 @@ std::size_t ReportTextEncoder::encodeCharacters(const Character *at, const Chara
 
     const auto special = static_cast<Character>(reportFile ? u'\n' : u'\r');
     while (at != end) {
-        while (static_cast<std::size_t>(end - at) >= runLength && isPlainRun(at, special)) {
-            for (std::size_t i = 0; i < runLength; ++i) {
-                out[i] = static_cast<char>(at[i]);
-            }
-            out += runLength;
-            at += runLength;
-        }
-        // Up to and with the character that is not plain; behind it whole runs are tried again.
+        const std::size_t copied = copyPlainRuns(at, end, special, out);
+        at += copied;
+        out += copied;
+        // Up to and with the character that is not plain; after it whole runs are tried again.
         while (at != end) {
             const char16_t character = *at++;
             if (character < 0x80 && character != special) {

@@ -1,4 +1,4 @@
-#include "FileExtension.h"
+#include "ReportSaveName.h"
 
 #include "PrintQt.h"
 
@@ -7,7 +7,7 @@
 namespace
 {
 
-TEST(FileExtension, CountsOnlyAtTheEndAndOnlyTheFirstTime)
+TEST(ReportSaveName, TheExtensionCountsOnlyAtTheEndAndOnlyTheFirstTime)
 {
     struct Row
     {
