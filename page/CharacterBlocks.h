@@ -58,7 +58,7 @@ public:
 
     /// Makes room for so many characters and the 0 after them.
     bool reserve(qint64 characters) { return characters <= usable_ || grow(characters); }
-    /// Takes characters over that were written behind the last one, within what was reserved.
+    /// Takes characters over that were written after the last one, within what was reserved.
     void setSize(qint64 size)
     {
         size_ = size;

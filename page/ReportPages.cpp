@@ -25,7 +25,7 @@ qint64 lineEndsIn(View text)
     return std::count(text.begin(), text.end(), typename View::value_type('\n'));
 }
 
-/// Behind so many line ends from a place, or the end of the text.
+/// After so many line ends from a place, or the end of the text.
 template <typename View>
 qint64 afterLines(View text, qint64 at, qint64 lines)
 {

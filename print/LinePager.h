@@ -35,7 +35,7 @@ public:
     /// or one more by a rounding, it takes just as many.
     void setUsualLines(int lines) { usualLines_ = lines; }
 
-    /// The characters of the text; the one behind the last line's end does not count.
+    /// The characters of the text; the one after the last line's end does not count.
     qint64 length() const;
 
     /// Lays out the characters from `start` to `stop` (-1: to the end) as far as they fit a rectangle in twips.

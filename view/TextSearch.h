@@ -18,7 +18,7 @@ public:
 
     bool isEmpty() const { return text_.isEmpty(); }
     qsizetype length() const { return text_.size(); }
-    /// The first match that begins at a place or behind it; -1 when there is none. @param from  0 or the end of a match
+    /// The first match that begins at a place or after it; -1 when there is none. @param from  0 or the end of a match
     qsizetype find(QStringView line, qsizetype from = 0) const;
     /// The last match that begins before a place; -1 when there is none.
     qsizetype findLast(QStringView line, qsizetype before) const;

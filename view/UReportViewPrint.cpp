@@ -86,7 +86,7 @@ PrintOutcome printText(UReportView &view, QPrinter &printer, PrintInfo &info, in
     source.find = [&, isKnown](QPainter &painter, int page) {
         info.curPage = page;
         view.OnPrepareDC(painter, info);
-        // A page that is found is printed, also behind the last that was counted: long lines take several rows.
+        // A page that is found is printed, also after the last that was counted: long lines take several rows.
         return isKnown(page) && !view.GetEdit().document()->isEmpty();
     };
     source.print = [&, isKnown](QPainter &painter, int page) {

@@ -184,7 +184,7 @@ void UReportView::takeEdit(const ReportChange &change)
         report->GetTextLength() == change.documentLengthBefore() &&
         report->ReplaceText(change.documentPosition(), change.documentRemoved(), change.documentInserted());
     if (!isReplaced) {
-        // Rich text, other line ends, or a text that was changed behind the view's back: the document takes over what
+        // Rich text, other line ends, or a text that was changed without the view being told: the document takes over what
         // the control shows, and every further edit as the change it is.
         takeChanged(change);
         report->SetModifiedFlag(true);

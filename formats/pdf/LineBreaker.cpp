@@ -12,7 +12,7 @@ void breakLine(QStringView line, double width, const CharacterWidth &characterWi
         --inkEnd;
     }
     qsizetype begin = 0;
-    qsizetype breakAt = 0; // behind the last blank of the piece
+    qsizetype breakAt = 0; // after the last blank of the piece
     double used = 0;
     qsizetype at = 0;
     while (at < inkEnd) {

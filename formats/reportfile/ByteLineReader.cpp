@@ -50,7 +50,7 @@ bool ByteLineReader::next()
         taken = ends ? taken + 1 : content;
     }
     if (!ends) {
-        // A CR whose LF may stand behind what was looked at belongs to the next piece.
+        // A CR whose LF may stand after what was looked at belongs to the next piece.
         content = taken = std::min(content, longestPiece);
     }
     size_ = content;

@@ -25,7 +25,7 @@ public:
     };
 
     /// Cuts a rich-text document down to its paragraph: from "\viewkind" up to the next closing brace.
-    /// @return false, with the text as it was, when it has no "\viewkind" behind its first character or no brace after it
+    /// @return false, with the text as it was, when it has no "\viewkind" after its first character or no brace after it
     static bool cutToParagraph(QString &document);
     /// The font table of one font. Its number is the font size, which nothing refers to: the templates choose number 1.
     static QString fontTable(const QString &fontName, unsigned fontSize);

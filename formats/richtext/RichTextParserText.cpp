@@ -186,7 +186,7 @@ void RichTextParser::endParagraph()
     sectionBreak_ = false;
 }
 
-/// A row is a paragraph, with a tab between its cells and none behind the last one.
+/// A row is a paragraph, with a tab between its cells and none after the last one.
 void RichTextParser::endRow(bool isNested)
 {
     if (!isShown()) {

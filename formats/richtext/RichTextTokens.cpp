@@ -78,7 +78,7 @@ RichTextToken RichTextTokens::control()
             return {.kind = RichTextTokenKind::Byte, .text = {}, .byte = static_cast<char>(high * 16 + low)};
         }
     }
-    // An LF behind an escaped CR is left out before the next token.
+    // An LF after an escaped CR is left out before the next token.
     return {.kind = RichTextTokenKind::Symbol, .text = {}, .byte = symbol == '\r' ? '\n' : symbol};
 }
 

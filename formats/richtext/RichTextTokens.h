@@ -15,7 +15,7 @@ enum class RichTextTokenKind
     Symbol,      ///< a backslash and another character; an escaped line end is '\n'
     Byte,        ///< a backslash, an apostrophe and two hexadecimal digits
     Text,        ///< bytes as they stand
-    MissingData, ///< binary data that would reach behind the end
+    MissingData, ///< binary data that would reach beyond the end
     End
 };
 
@@ -35,7 +35,7 @@ public:
     explicit RichTextTokens(QByteArrayView bytes) : bytes_(bytes.data(), static_cast<std::size_t>(bytes.size())) {}
 
     RichTextToken next();
-    /// Where the last token begins; behind the end of the bytes after the last one.
+    /// Where the last token begins; after the end of the bytes after the last one.
     qsizetype position() const { return static_cast<qsizetype>(start_); }
 
 private:
