@@ -88,14 +88,14 @@ DeskFrame::DeskFrame() : files_([this](const QString &path) { fileChanged(path);
     };
     loadLayout();
     UpdateCommands();
-    constexpr int lookInterval = 500; // milliseconds
-    auto *looking = new QTimer(this);
-    connect(looking, &QTimer::timeout, this, [this] { closeUnseen(); });
-    looking->start(lookInterval);
-    constexpr int keepInterval = 5000; // milliseconds
-    auto *timer = new QTimer(this);
-    connect(timer, &QTimer::timeout, this, [this] { recovery_.keep(); });
-    timer->start(keepInterval);
+    constexpr int closeInterval = 500; // milliseconds
+    auto *closeTimer = new QTimer(this);
+    connect(closeTimer, &QTimer::timeout, this, [this] { closeUnseen(); });
+    closeTimer->start(closeInterval);
+    constexpr int recoveryInterval = 5000; // milliseconds
+    auto *recoveryTimer = new QTimer(this);
+    connect(recoveryTimer, &QTimer::timeout, this, [this] { recovery_.keep(); });
+    recoveryTimer->start(recoveryInterval);
 }
 
 DeskFrame::~DeskFrame() = default;

@@ -128,16 +128,16 @@ void start(const std::shared_ptr<Waited> &state, std::function<void(AsideState &
 void waitFor(Waited &state, QEventLoop &loop, const QString &what, UserInput input)
 {
     WorkDialog dialog(UXTPMDIFrameWnd::Get(), [&state] { state.stop(); });
-    QTimer looking; // also for who stops the work
-    QObject::connect(&looking, &QTimer::timeout, &loop, [&] {
+    QTimer progressTimer; // also for who stops the work
+    QObject::connect(&progressTimer, &QTimer::timeout, &loop, [&] {
         if (state.isStopped() || (input == UserInput::Kept && dialog.isDue())) {
             loop.quit();
         } else if (dialog.isDue()) {
             dialog.show(what, state.percent());
         }
     });
-    constexpr int lookInterval = 50; // milliseconds
-    looking.start(lookInterval);
+    constexpr int progressInterval = 50; // milliseconds
+    progressTimer.start(progressInterval);
     if (input == UserInput::Kept) {
         loop.exec(QEventLoop::ExcludeUserInputEvents);
         input = UserInput::Taken; // from now on by the dialog alone

@@ -6,6 +6,7 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <type_traits>
 
 namespace
 {
@@ -79,6 +80,21 @@ TEST(ReportTextOneByte, WideningKeepsEveryCharacterAndTheZerosBehindThem)
     EXPECT_EQ(text.size(), 40001);
     EXPECT_TRUE(text.view() == eAcute.repeated(40000) + wide);
     EXPECT_TRUE(std::all_of(text.data() + 40001, text.data() + 64001, [](char16_t c) { return c == 0; }));
+}
+
+TEST(ReportTextOneByte, AVisitorReadsTheTextAsItIsKept)
+{
+    const auto form = [](auto whole) {
+        return QString(std::is_same_v<decltype(whole), QLatin1StringView> ? u'1' : u'2') + whole.toString();
+    };
+    ReportText text;
+    ASSERT_TRUE(text.append(QStringView(u"a")));
+    EXPECT_EQ(text.visit(form), QStringLiteral("1a"));
+    ASSERT_TRUE(text.replace(0, 1, u"bc")) << "also with an edit that has not been carried out yet";
+    EXPECT_EQ(text.visit(form), QStringLiteral("1bc"));
+    EXPECT_TRUE(text.isNarrow()) << "reading does not change how it is kept";
+    ASSERT_TRUE(text.append(wide));
+    EXPECT_EQ(text.visit(form), QStringLiteral("2bc") + wide);
 }
 
 TEST(ReportTextOneByte, BytesAreTakenAsCharactersAndNotAsSignedNumbers)
