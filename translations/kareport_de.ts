@@ -314,15 +314,15 @@
         <translation>Station</translation>
     </message>
     <message>
-        <location filename="../report/UReportDoc.cpp"/>
+        <location filename="../report/UReportDocSave.cpp"/>
+        <source>a part of the report was lost when memory ran out</source>
+        <translation>ein Teil des Berichts ging verloren, als der Speicher ausging</translation>
+    </message>
+    <message>
+        <location filename="../report/UReportDocText.cpp"/>
         <source>   Page:</source>
         <comment>Report Header</comment>
         <translation>   Seite:</translation>
-    </message>
-    <message>
-        <location filename="../report/UReportDocFile.cpp"/>
-        <source>a part of the report was lost when memory ran out</source>
-        <translation>ein Teil des Berichts ging verloren, als der Speicher ausging</translation>
     </message>
     <message>
         <location filename="../print/PageSetupDialog.cpp"/>

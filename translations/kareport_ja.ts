@@ -314,15 +314,15 @@
         <translation>測点No.</translation>
     </message>
     <message>
-        <location filename="../report/UReportDoc.cpp"/>
+        <location filename="../report/UReportDocSave.cpp"/>
+        <source>a part of the report was lost when memory ran out</source>
+        <translation>メモリ不足でレポートの一部が失われました</translation>
+    </message>
+    <message>
+        <location filename="../report/UReportDocText.cpp"/>
         <source>   Page:</source>
         <comment>Report Header</comment>
         <translation>   頁:</translation>
-    </message>
-    <message>
-        <location filename="../report/UReportDocFile.cpp"/>
-        <source>a part of the report was lost when memory ran out</source>
-        <translation>メモリ不足でレポートの一部が失われました</translation>
     </message>
     <message>
         <location filename="../print/PageSetupDialog.cpp"/>
