@@ -53,7 +53,8 @@ bool hasDoubledEnds(QByteArrayView bytes)
     return false;
 }
 
-/// Copies a piece of a file, with CR LF for every line end. @param dropped  how many CRs a line end has too many
+/// Copies a piece of a file. @param dropped  how many CRs a line end has too many: 1 in a saved report, where a line feed
+/// alone comes back as one, else 0, and every line end becomes CR LF
 /// @param room      is made long enough where it is not
 /// @param lineEnds  grows by those of the piece
 /// @return the copy, in the room
@@ -75,7 +76,8 @@ std::basic_string_view<Character> copyLines(std::basic_string_view<Character> pi
             --end;
         }
         out = std::copy_n(piece.data(), end, out);
-        out = std::fill_n(out, std::max<std::ptrdiff_t>(static_cast<std::ptrdiff_t>(feed - end) - dropped, 1), cr);
+        const std::ptrdiff_t least = dropped > 0 ? 0 : 1;
+        out = std::fill_n(out, std::max(static_cast<std::ptrdiff_t>(feed - end) - dropped, least), cr);
         *out++ = Character('\n');
         ++lineEnds;
         piece.remove_prefix(feed + 1);

@@ -33,7 +33,7 @@ enum class TextLoading
     NoMemory ///< or more characters than a report can have
 };
 
-/// Reads the bytes of a report file, as `decodeReportText` does. Every line end becomes CR LF, as those of a report are.
+/// Reads the bytes of a report file, as `decodeReportText` does.
 /// @param loaded   as it was made: empty
 /// @param proceed  is told the bytes done; its false stops the work. May be empty
 KAREPORT_EXPORT TextLoading loadReportText(QByteArrayView bytes, LoadedText &loaded,

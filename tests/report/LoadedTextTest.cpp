@@ -1,7 +1,6 @@
 #include "LoadedText.h"
 
 #include "FailingMemory.h"
-#include "LineEndings.h"
 #include "PageHeader.h"
 #include "PrintQt.h"
 #include "ReportTextCodec.h"
@@ -26,15 +25,15 @@ QString all(const LoadedText &loaded)
     return loaded.text.piece(0, loaded.text.size());
 }
 
-/// What a report has of a file that is decoded and written into it line by line.
+/// The report text of a file as it was written.
 QString written(const QByteArray &bytes)
 {
     QString text;
     EXPECT_FALSE(kareport::decodeReportText(bytes, text).has_value());
-    return kareport::withCrLf(text);
+    return text;
 }
 
-TEST(LoadedText, IsWhatTheDecoderGivesWithTheLineEndsOfAReport)
+TEST(LoadedText, IsWhatTheDecoderGives)
 {
     struct Row
     {

@@ -256,13 +256,14 @@ QString ModelledReport::longText(int seed)
 void ModelledReport::reload()
 {
     const QString path = folder_.filePath(QStringLiteral("a.rep"));
-    if (report().IsEmpty() || model_.text().contains(QStringLiteral("\n\n")) || !isAllCrLf()) {
-        return; // such a file comes back with other line ends
+    const QString text = model_.text();
+    if (report().IsEmpty() || (text.contains(u'\n') && !text.contains(QStringLiteral("\r\n")))) {
+        return; // with no line end of a report in it, such a file reads as that of an editor
     }
     report().SetPathName(path, false);
     wrongAnswer_ = wrongAnswer_ || !report().OnSaveDocument(path) || report().IsModified() ||
                    !kareport::reloadSavedReport(report());
-    model_.reload(model_.text());
+    model_.reload(text);
     model_.setLinesPerPage(report().GetLinesPerPage());
     isModified_ = false;
 }

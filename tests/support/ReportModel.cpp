@@ -143,15 +143,7 @@ void ReportModel::skipLines(int count)
 void ReportModel::reload(const QString &text)
 {
     clear();
-    for (const QString &line : text.split(u'\n')) {
-        write(line.endsWith(u'\r') ? line.chopped(1) : line);
-        lineFeed(1);
-    }
-    if (!cells_.empty()) { // after the last line feed there was no line
-        cells_.resize(cells_.size() - 2);
-        --lineNumber_;
-        --lineCount_;
-    }
+    write(text);
     startsAtEnd_ = false;
     findHeaders(0);
     history_.clear();
