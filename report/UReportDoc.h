@@ -355,6 +355,8 @@ public:
     int LoadFile(const QString &path, bool keepLineEnds);
     /// Whether the report's text was loaded from a rich-text file.
     bool IsOpenedFromRtf() const;
+    /// For a text that is taken over from a report that was. `Clear` takes it back.
+    void SetOpenedFromRtf(bool on);
 
     // --- The text of a host's object: UReportDocTextObject.cpp ------------------------------------------------------
 

@@ -129,6 +129,11 @@ bool UReportDoc::IsOpenedFromRtf() const
     return parts_->openedFromRtf;
 }
 
+void UReportDoc::SetOpenedFromRtf(bool on)
+{
+    parts_->openedFromRtf = on;
+}
+
 int UReportDoc::LoadFile(const QString &path, bool keepLineEnds)
 {
     if (path.isEmpty()) {

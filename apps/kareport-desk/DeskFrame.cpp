@@ -50,6 +50,21 @@ void sayWhatIsNotShown(const QString &path, const kareport::ReadNotes &notes)
     }
 }
 
+/// What is said of a file that is there and could not be read.
+QString whyNotRead(const QString &path, const kareport::ReadNotes &notes)
+{
+    return notes.problem.isEmpty() ? Xlate("\"%1\" could not be opened.").arg(path)
+                                   : Xlate("\"%1\" could not be opened: %2").arg(path, notes.problem);
+}
+
+/// What is said of a report that could not be opened again.
+QString lineOf(const kareport::KeptReport &kept, const kareport::ReadNotes &notes)
+{
+    const QString missing = kept.textFile.isEmpty() ? kareport::whyNotOpened(kept.path) : QString();
+    const QString reason = missing.isEmpty() ? notes.problem : missing;
+    return reason.isEmpty() ? kept.name() : kept.name() + QStringLiteral(": ") + reason;
+}
+
 /// The open document of a file; null when there is none. @param except  which is not meant
 UDocument *documentOf(const QString &path, const UDocument *except = nullptr)
 {
@@ -174,7 +189,7 @@ bool DeskFrame::OpenFile(const QString &path)
         }
         kareport::ReadNotes notes;
         report = openReport(file, notes);
-        error = report == nullptr && !notes.isStopped ? Xlate("\"%1\" could not be opened.").arg(path) : QString();
+        error = report == nullptr && !notes.isStopped ? whyNotRead(path, notes) : QString();
         const bool isOpened = finishOpening(report, error);
         sayWhatIsNotShown(path, notes);
         return isOpened;
@@ -217,6 +232,7 @@ std::vector<kareport::KeptReport> DeskFrame::reopen(const std::vector<kareport::
     kareport::ReadNotes notes;
     for (const kareport::KeptReport &kept : left) {
         const auto open = [&] { return kareport::Recovery::reopen(kept, &notes); };
+        notes.problem.clear();
         UReportDoc *report = notes.isStopped ? nullptr : read(kept.path, open);
         if (report != nullptr) {
             activate(report);
@@ -225,7 +241,7 @@ std::vector<kareport::KeptReport> DeskFrame::reopen(const std::vector<kareport::
         }
         notReopened.push_back(kept);
         if (!notes.isStopped) {
-            lost.append(kept.name());
+            lost.append(lineOf(kept, notes));
             isTextKept = isTextKept || kareport::Recovery::holdsText(kept);
         }
     }
@@ -315,7 +331,7 @@ void DeskFrame::loadAgain(UReportDoc &report)
         report.SetModifiedFlag(true); // what is shown stands in no file any more
         if (!notes.isStopped) {
             const QString reason = kareport::whyNotOpened(path);
-            AppMessageBox(reason.isEmpty() ? Xlate("\"%1\" could not be opened.").arg(path) : reason);
+            AppMessageBox(reason.isEmpty() ? whyNotRead(path, notes) : reason);
         }
     }
 }

@@ -57,7 +57,7 @@ const UReportView *formattedView(const UReportDoc &report)
 TextFile readText(const KeptReport &kept)
 {
     if (!Recovery::holdsText(kept)) {
-        return {};
+        return {TextFile::State::NotRead, nullptr, Xlate("what was kept of it is no longer there")};
     }
     return readTextFile(kept.textFile, UserInput::Taken,
                         [lines = kept.pageLines](QByteArrayView bytes, LoadedText &loaded, const auto &proceed) {
@@ -228,6 +228,7 @@ UReportDoc *Recovery::reopen(const KeptReport &kept, ReadNotes *notes)
         const TextFile read = readText(kept);
         if (notes != nullptr) {
             notes->isStopped = read.state == TextFile::State::Stopped;
+            notes->problem = read.problem;
         }
         report = read.text ? CreateReport(kept.title, true, false, nullptr, 0, nullptr) : nullptr;
         return report != nullptr && fill(*report, kept, *read.text);

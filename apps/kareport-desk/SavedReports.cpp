@@ -11,6 +11,7 @@
 #include "SavedText.h"
 #include "TextFile.h"
 #include "UReportDoc.h"
+#include "UView.h"
 #include "Xlate.h"
 
 #include <QFile>
@@ -26,13 +27,41 @@ namespace
 {
 
 /// The text of a report file as it was before it was saved: each line end once, and UTF-8 as the characters that it stands
-/// for. Rich text, and what is no UTF-8, is another text, which the report loads byte by byte.
+/// for. Rich text, and what is no UTF-8, is another text, which the report loads byte by byte. A name that rich text has says
+/// nothing: without a view that could write that, the report text is saved under it.
 TextFile readReportFile(const QString &path, UserInput input)
 {
-    if (path.endsWith(u".rtf", Qt::CaseInsensitive)) {
-        return {TextFile::State::OtherText, nullptr};
+    const bool mayBeRichText = path.endsWith(u".rtf", Qt::CaseInsensitive);
+    return readTextFile(path, input, [mayBeRichText](QByteArrayView bytes, LoadedText &loaded, const auto &proceed) {
+        return mayBeRichText && !richTextIn(bytes).isEmpty() ? TextLoading::OtherText
+                                                             : loadReportText(bytes, loaded, proceed);
+    });
+}
+
+/// Another text, as a report that is opened from the file has it.
+struct OtherText
+{
+    LoadedText text;
+    bool isFromRtf = false;
+};
+
+/// Reads one into a report that nobody sees. @return why it was not read; nothing when it was
+std::optional<QString> readOther(const QString &path, OtherText &other)
+{
+    if (QFileInfo(path).size() > UView::nMaxSize) {
+        return Xlate("it is too large");
     }
-    return readTextFile(path, input, loadReportText);
+    UReportDoc read;
+    read.SetAutoDelete(false);
+    read.SetRTFDataFlag(false); // in rich-text mode nothing is loaded
+    if (!read.OnOpenDocument(path)) {
+        return Xlate("there is not enough memory for it");
+    }
+    other.isFromRtf = read.IsOpenedFromRtf();
+    other.text.pageStarts = read.GetPageStarts();
+    other.text.lineEnds = read.GetLineCount();
+    read.TakeText(other.text);
+    return std::nullopt;
 }
 
 /// The pages of a report that was loaded byte by byte, or as rich text, are those that it was written in, whatever a page
@@ -53,13 +82,14 @@ QStringList keepPageLength(UReportDoc &report)
     return warnings;
 }
 
-/// @return whether the report has all of the text
-bool fill(UReportDoc &report, LoadedText &loaded)
+/// Puts a text in the place of what a report holds.
+void put(UReportDoc &report, LoadedText &loaded, bool isFromRtf)
 {
     // A window that shows the report while it is written is told line by line.
     const bool isWatched = report.GetReportWindow() != nullptr;
     const QString copy = isWatched ? loaded.text.piece(0, loaded.text.size()) : QString();
     report.Clear();
+    report.SetOpenedFromRtf(isFromRtf);
     if (loaded.linesPerPage) {
         report.FixPage(loaded.linesPerPage, std::nullopt);
     }
@@ -70,7 +100,15 @@ bool fill(UReportDoc &report, LoadedText &loaded)
     } else {
         report.TakeText(loaded);
     }
+}
+
+/// @return whether the report has all of the text
+bool show(UReportDoc &report)
+{
     report.UpdateAllViews(nullptr, 0, nullptr);
+    if (!UReportDoc::IsReportAvailable(&report)) {
+        return false; // an editor that took it has closed it
+    }
     report.SetModifiedFlag(false);
     return !report.HasLostText();
 }
@@ -78,7 +116,9 @@ bool fill(UReportDoc &report, LoadedText &loaded)
 /// A page length that only the text told goes with the text. One that was given otherwise, as by a job, stays.
 void forgetPageLengthOfText(UReportDoc &report)
 {
-    if (report.GetGivenLinesPerPage() && report.GetGivenLinesPerPage() == linesOfPages(shownPlainText(report))) {
+    const std::optional<int> given = report.GetGivenLinesPerPage();
+    // By the lines of the text, or by those that it shows: a return within a line ends one that is shown.
+    if (given && (given == linesOfPages(report.CopyText()) || given == linesOfPages(shownPlainText(report)))) {
         report.FixPage(std::nullopt, std::nullopt);
         report.SetPageSize();
     }
@@ -86,26 +126,32 @@ void forgetPageLengthOfText(UReportDoc &report)
 
 bool reload(UReportDoc &report, ReadNotes &notes)
 {
-    if (!whyNotOpened(report.GetPathName()).isEmpty() || !QFile(report.GetPathName()).open(QIODevice::ReadOnly)) {
+    const QString path = report.GetPathName();
+    if (!whyNotOpened(path).isEmpty() || !QFile(path).open(QIODevice::ReadOnly)) {
         return false; // what is shown is then all that there is
     }
     // What the user types until the file has been read would go with the text before it.
-    const TextFile read = readReportFile(report.GetPathName(), UserInput::Kept);
+    const TextFile read = readReportFile(path, UserInput::Kept);
     notes.isStopped = read.state == TextFile::State::Stopped;
+    notes.problem = read.problem;
     const bool isRead = read.state == TextFile::State::Whole || read.state == TextFile::State::OtherText;
     if (!isRead || !UReportDoc::IsReportAvailable(&report)) {
         return false;
     }
-    report.SetRTFDataFlag(false); // in rich-text mode nothing is loaded
-    forgetPageLengthOfText(report);
-    if (read.text) {
-        return fill(report, *read.text);
+    OtherText other;
+    if (!read.text) {
+        if (const auto problem = readOther(path, other)) {
+            notes.problem = *problem;
+            return false;
+        }
     }
-    report.Clear();
-    const bool isLoaded = report.OnOpenDocument(report.GetPathName());
-    notes.warnings = keepPageLength(report);
-    report.UpdateAllViews(nullptr, 0, nullptr);
-    return isLoaded;
+    report.SetRTFDataFlag(false);
+    forgetPageLengthOfText(report);
+    put(report, read.text ? *read.text : other.text, other.isFromRtf);
+    if (!read.text) {
+        notes.warnings = keepPageLength(report);
+    }
+    return show(report);
 }
 
 } // namespace
@@ -131,6 +177,7 @@ UReportDoc *openSavedReport(const QString &path, ReadNotes *notes)
     }
     const TextFile read = readReportFile(path, UserInput::Taken);
     said.isStopped = read.state == TextFile::State::Stopped;
+    said.problem = read.problem;
     if (read.state == TextFile::State::OtherText) {
         auto *other =
             dynamic_cast<UReportDoc *>(GetReportTemplate()->OpenReportDocumentFile(path, 1, 1, nullptr, 0, nullptr));
@@ -141,8 +188,11 @@ UReportDoc *openSavedReport(const QString &path, ReadNotes *notes)
     }
     UReportDoc *report = read.text ? CreateReport(QString(), true, false, nullptr, 0, nullptr) : nullptr;
     if (report != nullptr) {
-        if (!fill(*report, *read.text)) {
-            report->OnCloseDocument();
+        put(*report, *read.text, false);
+        if (!show(*report)) {
+            if (UReportDoc::IsReportAvailable(report)) {
+                report->OnCloseDocument();
+            }
             return nullptr;
         }
         report->SetPathName(path, true);

@@ -14,7 +14,8 @@ QString whyNotOpened(const QString &path);
 struct ReadNotes
 {
     bool isStopped = false; ///< by the user; nothing more is to be said
-    QStringList warnings;   ///< sentences about what the file holds and the report does not show
+    QString problem; ///< why it was not read, as a part of a sentence; empty where it was, or where nothing is known
+    QStringList warnings; ///< sentences about what the file holds and the report does not show
 };
 
 /// Opens a saved report in a pane. The windows answer while a long file is read: the report is there once it has been.

@@ -27,32 +27,45 @@ TextFile::State stateOf(TextLoading loading)
     }
 }
 
-TextFile::State readInto(LoadedText &loaded, const QString &path, const LoadText &load, AsideState &state)
+QString noMemory()
+{
+    return Xlate("there is not enough memory for it");
+}
+
+TextFile::State readInto(TextFile &read, const QString &path, const LoadText &load, AsideState &state)
 {
     const auto file = FileBytes::open(path);
-    if (errorOf(file) != nullptr) {
+    if (const InputError *error = errorOf(file)) {
+        read.problem = error->text;
         return TextFile::State::NotRead;
     }
     const FileBytes &bytes = *std::get<std::shared_ptr<const FileBytes>>(file);
     const std::string_view view = bytes.view();
     const auto size = static_cast<qsizetype>(view.size());
-    const TextLoading loading = load(QByteArrayView(view.data(), size), loaded, [&state, size](qint64 done) {
+    const TextLoading loading = load(QByteArrayView(view.data(), size), *read.text, [&state, size](qint64 done) {
         state.setPercent(static_cast<int>(done * 100 / size));
         return !state.isStopped();
     });
-    // What is left of a file that was cut short is not what was saved.
-    return bytes.lostBytes() ? TextFile::State::NotRead : stateOf(loading);
+    if (const auto lost = bytes.lostBytes()) {
+        read.problem = lost->text; // what is left of the file is not what was saved
+        return TextFile::State::NotRead;
+    }
+    read.problem = loading == TextLoading::NoMemory ? noMemory() : QString();
+    return stateOf(loading);
 }
 
 TextFile readNow(const QString &path, const LoadText &load, AsideState &state)
 {
     TextFile read;
-    read.state = whileMemoryLasts(TextFile::State::NotRead, [&] {
+    const bool isDone = doneWhileMemoryLasts([&] {
         read.text = std::make_unique<LoadedText>();
-        return readInto(*read.text, path, load, state);
+        read.state = readInto(read, path, load, state);
     });
     if (read.state != TextFile::State::Whole) {
         read.text.reset();
+    }
+    if (!isDone) {
+        doneWhileMemoryLasts([&read] { read.problem = noMemory(); });
     }
     return read;
 }

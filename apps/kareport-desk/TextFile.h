@@ -24,6 +24,7 @@ struct TextFile
 
     State state = State::NotRead;
     std::unique_ptr<LoadedText> text; ///< null unless all of it was read
+    QString problem = {};             ///< why it was not read, as a part of a sentence
 };
 
 /// Turns a file's bytes into a text, on whatever thread.

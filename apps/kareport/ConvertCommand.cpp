@@ -63,14 +63,6 @@ std::optional<InputError> readRichText(const QString &path, QByteArrayView bytes
     return std::nullopt;
 }
 
-/// The rich text of a file that may begin with a byte-order mark or white space; empty when it is no rich text.
-QByteArrayView richTextIn(QByteArrayView bytes)
-{
-    constexpr QByteArrayView mark("\xEF\xBB\xBF");
-    const QByteArrayView text = bytes.sliced(bytes.startsWith(mark) ? mark.size() : 0).trimmed();
-    return isRichText(text) ? bytes.sliced(text.data() - bytes.data()) : QByteArrayView();
-}
-
 } // namespace
 
 std::optional<QString> ConvertCommand::usageError() const

@@ -84,6 +84,13 @@ bool isRichText(QLatin1StringView text)
     return text.startsWith(QLatin1StringView(beginning));
 }
 
+QByteArrayView richTextIn(QByteArrayView bytes)
+{
+    constexpr QByteArrayView mark("\xEF\xBB\xBF");
+    const QByteArrayView text = bytes.sliced(bytes.startsWith(mark) ? mark.size() : 0).trimmed();
+    return isRichText(text) ? bytes.sliced(text.data() - bytes.data()) : QByteArrayView();
+}
+
 std::optional<RichTextError> readRichText(QByteArrayView bytes, QTextDocument &document, RichTextNotes *notes)
 {
     return readBytes(bytes, RichTextRawBytes::CodePage, document, notes);

@@ -42,6 +42,10 @@ KAREPORT_EXPORT bool isRichText(QByteArrayView bytes);
 KAREPORT_EXPORT bool isRichText(QStringView text);
 KAREPORT_EXPORT bool isRichText(QLatin1StringView text);
 
+/// The rich text of a file, whatever it is called: it may begin with a byte-order mark or white space. Empty when it is
+/// none.
+KAREPORT_EXPORT QByteArrayView richTextIn(QByteArrayView bytes);
+
 /// Reads the bytes of a rich-text file (RTF) into a document, whose content is replaced. Bytes from 0x80 on are read in the
 /// code page of the current font, else of the file. What stands after the end of the outermost group is not read.
 /// Headers, footers, notes, pictures, objects and hidden text are passed over and counted in `notes`.

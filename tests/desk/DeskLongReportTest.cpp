@@ -220,7 +220,9 @@ TEST(DeskLongReport, WhoseFileIsCutShortMeanwhileIsWholeOrNotThere)
             EXPECT_TRUE(text == textOfFile(content) || text == textOfFile(content.first(half))) << turn;
             continue;
         }
-        EXPECT_EQ(desk.messages, QStringList{QStringLiteral("\"%1\" could not be opened.").arg(folder.path("a.rep"))});
+        EXPECT_EQ(desk.messages,
+                  QStringList{QStringLiteral("\"%1\" could not be opened: the file was cut short while it was read")
+                                  .arg(folder.path("a.rep"))});
         EXPECT_TRUE(Desk::reports().empty());
     }
 }

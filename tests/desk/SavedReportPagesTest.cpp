@@ -13,6 +13,8 @@
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
+
 namespace
 {
 
@@ -107,6 +109,22 @@ TEST(SavedReportPages, APageLengthThatTheTextToldGoesWithTheText)
     UReportDoc *report = kareport::openSavedReport(files.path("a.rep"));
     ASSERT_NE(report, nullptr);
     ASSERT_TRUE(report->IsPageFixed());
+    files.put("a.rep", "\xEF\xBB\xBFone\r\r\ntwo\r\r\n");
+    ASSERT_TRUE(kareport::reloadSavedReport(*report));
+    EXPECT_FALSE(report->IsPageFixed()) << "as if it were opened now";
+}
+
+TEST(SavedReportPages, ReturnsWithinLinesDoNotHoldAPageLengthOfAnOlderText)
+{
+    QStringList lines = savedLines();
+    std::replace(lines.begin(), lines.end(), QStringLiteral("a"), QStringLiteral("a\rz"));
+    const JobFolder files;
+    files.put("a.rep", "\xEF\xBB\xBF" + lines.join(QStringLiteral("\r\r\n")).toUtf8());
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    UReportDoc *report = kareport::openSavedReport(files.path("a.rep"));
+    ASSERT_NE(report, nullptr);
+    ASSERT_EQ(report->GetLinesPerPage(), 7);
     files.put("a.rep", "\xEF\xBB\xBFone\r\r\ntwo\r\r\n");
     ASSERT_TRUE(kareport::reloadSavedReport(*report));
     EXPECT_FALSE(report->IsPageFixed()) << "as if it were opened now";
