@@ -583,6 +583,11 @@
         <translation>Berichtstext</translation>
     </message>
     <message>
+        <location filename="../view/ReportEditCopy.cpp"/>
+        <source>There is not enough memory to copy this. The clipboard is as it was.</source>
+        <translation>Der Speicher reicht nicht aus, um dies zu kopieren. Die Zwischenablage ist unverändert.</translation>
+    </message>
+    <message>
         <location filename="../view/ReportViewWidget.cpp"/>
         <source>Page</source>
         <translation>Seite</translation>
@@ -1481,6 +1486,16 @@
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
+        <source>"%1" could not be opened.</source>
+        <translation>„%1“ konnte nicht geöffnet werden.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
+        <source>"%1" could not be opened: %2</source>
+        <translation>„%1“ konnte nicht geöffnet werden: %2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>Open a job or a saved report, or drop it here.</source>
         <translation>Auftrag oder gespeicherten Bericht öffnen oder hierher ziehen.</translation>
     </message>
@@ -1498,11 +1513,6 @@
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>All files (*)</source>
         <translation>Alle Dateien (*)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>"%1" could not be opened.</source>
-        <translation>„%1“ konnte nicht geöffnet werden.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
@@ -1765,6 +1775,11 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
         <translation>Pro&amp;gramm</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/Recovery.cpp"/>
+        <source>what was kept of it is no longer there</source>
+        <translation>Was davon aufbewahrt wurde, ist nicht mehr vorhanden</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
         <source>There is no folder "%1". Choose another one, or create it first.</source>
         <translation>Der Ordner „%1“ ist nicht vorhanden. Wählen Sie einen anderen, oder legen Sie ihn zuerst an.</translation>
@@ -1797,6 +1812,16 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
         <source>Save As</source>
         <translation>Speichern unter</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SavedReports.cpp"/>
+        <source>it is too large</source>
+        <translation>Die Datei ist zu groß</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SavedReports.cpp"/>
+        <source>there is not enough memory for it</source>
+        <translation>Der Speicher reicht dafür nicht aus</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/SavedReports.cpp"/>

@@ -583,6 +583,11 @@
         <translation>帳票のテキスト</translation>
     </message>
     <message>
+        <location filename="../view/ReportEditCopy.cpp"/>
+        <source>There is not enough memory to copy this. The clipboard is as it was.</source>
+        <translation>コピーするメモリが足りません。クリップボードの内容は変わっていません。</translation>
+    </message>
+    <message>
         <location filename="../view/ReportViewWidget.cpp"/>
         <source>Page</source>
         <translation>ページ</translation>
@@ -1481,6 +1486,16 @@
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
+        <source>"%1" could not be opened.</source>
+        <translation>「%1」を開けませんでした。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
+        <source>"%1" could not be opened: %2</source>
+        <translation>「%1」を開けませんでした: %2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>Open a job or a saved report, or drop it here.</source>
         <translation>ジョブまたは保存した帳票を開くか、ここにドロップしてください。</translation>
     </message>
@@ -1498,11 +1513,6 @@
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>All files (*)</source>
         <translation>すべてのファイル (*)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>"%1" could not be opened.</source>
-        <translation>「%1」を開けませんでした。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
@@ -1765,6 +1775,11 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
         <translation>プログラム(&amp;G)</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/Recovery.cpp"/>
+        <source>what was kept of it is no longer there</source>
+        <translation>保管されていた内容が見つかりません</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
         <source>There is no folder "%1". Choose another one, or create it first.</source>
         <translation>フォルダー「%1」がありません。別のフォルダーを選ぶか、先に作成してください。</translation>
@@ -1797,6 +1812,16 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
         <source>Save As</source>
         <translation>名前を付けて保存</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SavedReports.cpp"/>
+        <source>it is too large</source>
+        <translation>ファイルが大きすぎます</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SavedReports.cpp"/>
+        <source>there is not enough memory for it</source>
+        <translation>メモリが足りません</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/SavedReports.cpp"/>

@@ -1,5 +1,7 @@
 #include "UReportList.h"
 
+#include "MemoryLasts.h"
+#include "ReportEdit.h"
 #include "ReportLines.h"
 #include "ReportResources.h"
 
@@ -121,7 +123,11 @@ int UReportList::GetCurSel() const
 void UReportList::CopyLine() const
 {
     if (GetCurSel() >= 0) {
-        QGuiApplication::clipboard()->setText(GetText(GetCurSel()));
+        const bool isCopied =
+            kareport::doneWhileMemoryLasts([this] { QGuiApplication::clipboard()->setText(GetText(GetCurSel())); });
+        if (!isCopied) {
+            kareport::sayNotCopied();
+        }
     }
 }
 

@@ -69,6 +69,10 @@ public:
     QString windowText();
     /// As the control's own, after all of the text has been loaded.
     void selectAll();
+    /// As the control's own. Where there is no memory for a copy, the clipboard and the text stay as they are, which is
+    /// said.
+    void copy();
+    void cut();
     /// The line at the top of the window, from 0.
     int firstVisibleLine() const { return firstVisibleBlock().blockNumber(); }
     qint64 windowTextLength() const { return qint64(length_) + lineEnds_; }
@@ -87,8 +91,15 @@ protected:
     void focusInEvent(QFocusEvent *event) override;
     void paintEvent(QPaintEvent *event) override;
     void insertFromMimeData(const QMimeData *source) override;
+    /// Empty when there is no memory for it.
+    QMimeData *createMimeDataFromSelection() const override;
+    void contextMenuEvent(QContextMenuEvent *event) override;
+    /// The selected text for other programs. @throws std::bad_alloc
+    virtual std::unique_ptr<QMimeData> selection() const;
 
 private:
+    bool copySelection() const;
+
     /// Where cursor and window stand.
     struct Place
     {
@@ -129,5 +140,8 @@ private:
     int wheel_ = 0; ///< eighths of a degree turned since the last step
     QImage zoomDevice_;
 };
+
+/// Says that there was no memory for a copy.
+KAREPORT_EXPORT void sayNotCopied();
 
 } // namespace kareport

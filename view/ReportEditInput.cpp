@@ -104,6 +104,14 @@ void ReportEdit::keyPressEvent(QKeyEvent *event)
     {
         finishLoading(); // the end is that of the whole text
     }
+    if (event->matches(QKeySequence::Copy)) {
+        copy();
+        return;
+    }
+    if (event->matches(QKeySequence::Cut) && !isReadOnly()) {
+        cut();
+        return;
+    }
     if (event->matches(QKeySequence::InsertLineSeparator) && !isReadOnly()) {
         // A report has lines only: a break within a paragraph would be a character that no printer knows.
         textCursor().insertBlock();

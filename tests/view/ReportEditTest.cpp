@@ -1,8 +1,14 @@
 #include "ReportEdit.h"
 
+#include "AppMessageBox.h"
 #include "LinePager.h"
 #include "PrintQt.h"
 
+#include <QAction>
+#include <QApplication>
+#include <QClipboard>
+#include <QContextMenuEvent>
+#include <QMenu>
 #include <QMimeData>
 #include <QPrinter>
 #include <QScrollBar>
@@ -325,6 +331,92 @@ TEST(ReportEdit, WrongRichTextShowsWhatWasReadUpToThere)
     ASSERT_TRUE(error.has_value());
     EXPECT_TRUE(edit.toPlainText().startsWith(QStringLiteral("some")));
     EXPECT_FALSE(edit.accessibleName().isEmpty());
+}
+
+/// A control for whose copies there is no memory.
+class EditWithoutMemory : public ReportEdit
+{
+public:
+    std::unique_ptr<QMimeData> selection() const override { throw std::bad_alloc(); }
+    using ReportEdit::createMimeDataFromSelection;
+};
+
+/// Chooses an entry of the control's own menu.
+void chooseFromMenu(ReportEdit &edit, const char *name)
+{
+    QContextMenuEvent event(QContextMenuEvent::Keyboard, QPoint(1, 1), QPoint(1, 1));
+    QCoreApplication::sendEvent(edit.viewport(), &event);
+    auto *menu = qobject_cast<QMenu *>(QApplication::activePopupWidget());
+    ASSERT_NE(menu, nullptr);
+    auto *action = menu->findChild<QAction *>(QLatin1StringView(name));
+    ASSERT_NE(action, nullptr) << name;
+    action->trigger();
+    menu->close();
+}
+
+template <typename Edit>
+void copyEveryWay(const std::function<void(Edit &edit, bool cuts)> &expect)
+{
+    const struct
+    {
+        std::function<void(Edit &)> act;
+        bool cuts;
+    } ways[] = {
+        {[](Edit &edit) { edit.copy(); }, false},
+        {[](Edit &edit) { QTest::keyClick(&edit, Qt::Key_C, Qt::ControlModifier); }, false},
+        {[](Edit &edit) { chooseFromMenu(edit, "edit-copy"); }, false},
+        {[](Edit &edit) { edit.cut(); }, true},
+        {[](Edit &edit) { QTest::keyClick(&edit, Qt::Key_X, Qt::ControlModifier); }, true},
+        {[](Edit &edit) { chooseFromMenu(edit, "edit-cut"); }, true},
+    };
+    for (const auto &way : ways) {
+        QGuiApplication::clipboard()->setText(QStringLiteral("before"));
+        Edit edit;
+        edit.loadPlainText(QStringLiteral("one\ntwo"));
+        edit.resize(200, 100);
+        edit.show();
+        edit.selectAll();
+        way.act(edit);
+        expect(edit, way.cuts);
+    }
+}
+
+TEST(ReportEdit, CopiesAndCuts)
+{
+    copyEveryWay<ReportEdit>([](ReportEdit &edit, bool cuts) {
+        EXPECT_EQ(QGuiApplication::clipboard()->text(), QStringLiteral("one\ntwo"));
+        EXPECT_EQ(edit.toPlainText(), cuts ? QString() : QStringLiteral("one\ntwo"));
+    });
+    ReportEdit edit;
+    edit.loadPlainText(QStringLiteral("one"));
+    QGuiApplication::clipboard()->setText(QStringLiteral("before"));
+    edit.copy();
+    edit.cut();
+    EXPECT_EQ(QGuiApplication::clipboard()->text(), QStringLiteral("before")) << "nothing is selected";
+    edit.setReadOnly(true);
+    edit.selectAll();
+    edit.cut();
+    QTest::keyClick(&edit, Qt::Key_X, Qt::ControlModifier);
+    EXPECT_EQ(edit.toPlainText(), QStringLiteral("one")) << "nothing may be edited";
+}
+
+TEST(ReportEdit, ACopyWithoutMemoryIsSaidAndLeavesClipboardAndText)
+{
+    QStringList said;
+    kareport::setMessageHandler([&said](const QString &text, MessageButtons) {
+        said.append(text);
+        return MessageAnswer::Ok;
+    });
+    copyEveryWay<EditWithoutMemory>([&said](EditWithoutMemory &edit, bool /*cuts*/) {
+        EXPECT_EQ(QGuiApplication::clipboard()->text(), QStringLiteral("before"));
+        EXPECT_EQ(edit.toPlainText(), QStringLiteral("one\ntwo"));
+        EXPECT_EQ(said,
+                  QStringList{QStringLiteral("There is not enough memory to copy this. The clipboard is as it was.")});
+        said.clear();
+        const std::unique_ptr<QMimeData> dragged(edit.createMimeDataFromSelection());
+        EXPECT_FALSE(dragged->hasText()) << "nobody takes what is dragged then";
+    });
+    kareport::setMessageHandler({});
 }
 
 } // namespace
