@@ -12,6 +12,7 @@
 
 #include <QApplication>
 #include <QDockWidget>
+#include <QLayout>
 
 #include <algorithm>
 #include <cstddef>
@@ -113,6 +114,7 @@ void DeskFrame::newWindow()
 
 void DeskFrame::dockAll(const std::function<void(QDockWidget *, QDockWidget *)> &join)
 {
+    layout()->setEnabled(false); // each pane would lay all others out anew: once, at the end, is enough
     QDockWidget *before = nullptr;
     for (QDockWidget *dock : findChildren<QDockWidget *>(QString(), Qt::FindDirectChildrenOnly)) {
         const auto *paneDock = dynamic_cast<kareport::PaneDock *>(dock);
@@ -128,6 +130,8 @@ void DeskFrame::dockAll(const std::function<void(QDockWidget *, QDockWidget *)> 
         }
         before = dock;
     }
+    layout()->setEnabled(true);
+    layout()->activate();
 }
 
 void DeskFrame::arrange(Qt::Orientation orientation)

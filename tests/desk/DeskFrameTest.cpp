@@ -358,6 +358,45 @@ TEST(DeskFrame, WindowsOfAReportAreTiledAndJoined)
     desk.answer = MessageAnswer::No;
 }
 
+/// Counts how often widgets get another place or size.
+class PlacesCounted : public QObject
+{
+public:
+    bool eventFilter(QObject * /*watched*/, QEvent *event) override
+    {
+        count += event->type() == QEvent::Resize || event->type() == QEvent::Move ? 1 : 0;
+        return false;
+    }
+    int count = 0;
+};
+
+TEST(DeskFrame, TilingLaysThePanesOutOnce)
+{
+    Desk desk;
+    for (int i = 0; i < 24; ++i) {
+        ASSERT_TRUE(desk.frame->OnCommand(fileNewCommand));
+    }
+    const auto docks = desk.frame->findChildren<QDockWidget *>(QString(), Qt::FindDirectChildrenOnly);
+    for (const unsigned command : {windowTileHorizontallyCommand, windowTileVerticallyCommand, windowCascadeCommand}) {
+        for (qsizetype i = 0; i < docks.size(); i += 2) {
+            docks[i]->setFloating(true);
+        }
+        QCoreApplication::processEvents();
+        PlacesCounted places;
+        for (QDockWidget *dock : docks) {
+            dock->installEventFilter(&places);
+        }
+        ASSERT_TRUE(desk.frame->OnCommand(command));
+        // One that floats is moved once more. Were all laid out for each of them, a hundred panes would take a minute.
+        EXPECT_LE(places.count, 6 * docks.size()) << command;
+        for (const QDockWidget *dock : docks) {
+            EXPECT_FALSE(dock->isFloating()) << command;
+            EXPECT_TRUE(dock->isVisible()) << command;
+        }
+    }
+    desk.answer = MessageAnswer::No;
+}
+
 TEST(DeskFrame, AKeyGoesFromReportToReport)
 {
     Desk desk;
