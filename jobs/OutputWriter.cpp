@@ -118,7 +118,7 @@ private:
         PdfNotes notes;
         const bool done = report_.WritePdf(device, &notes, [this](qint64 page, qint64 pages) {
             progress_.advance(static_cast<std::size_t>(page), static_cast<std::size_t>(pages));
-            return !isInterrupted();
+            return !isInterrupted() && !(output_.isStandardOutput() && isOutputReaderGone());
         });
         problem_ = notes.problem;
         warnings_ += notes.warnings();

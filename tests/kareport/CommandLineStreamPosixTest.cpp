@@ -4,6 +4,7 @@
 #include <csignal>
 #include <sys/resource.h>
 #include <sys/stat.h>
+#include <unistd.h>
 
 #include <gtest/gtest.h>
 
@@ -25,6 +26,16 @@ public:
     }
 };
 
+/// The largest percentage that the program has shown.
+int furthestIn(const QByteArray &err)
+{
+    int furthest = 0;
+    for (const QByteArray &word : err.simplified().split(' ')) {
+        furthest = std::max(furthest, word.toInt());
+    }
+    return furthest;
+}
+
 TEST(CommandLineStream, AFullDiskLeavesTheOldFileAndIsSaidAtOnce)
 {
     const LongJob folder("out.rep");
@@ -40,11 +51,7 @@ TEST(CommandLineStream, AFullDiskLeavesTheOldFileAndIsSaidAtOnce)
     const QByteArray err = process.readAllStandardError();
     EXPECT_EQ(process.exitCode(), 3) << err.constData();
     EXPECT_TRUE(err.contains("out.rep\" could not be written: File too large")) << err.constData();
-    int furthest = 0;
-    for (const QByteArray &word : err.simplified().split(' ')) {
-        furthest = std::max(furthest, word.toInt());
-    }
-    EXPECT_LT(furthest, 50) << "the rest of the rows was not read for nothing";
+    EXPECT_LT(furthestIn(err), 50) << "the rest of the rows was not read for nothing";
     EXPECT_EQ(folder.bytesOf("out.rep"), "kept");
     EXPECT_EQ(folder.names(), words("job.json out.rep points.csv t.xml"));
 }
@@ -84,6 +91,44 @@ TEST(CommandLineStream, StoppedInTheMiddleTheOldFileStays)
         }
         EXPECT_EQ(folder.bytesOf("out.rep"), "kept") << signal;
         EXPECT_EQ(folder.names(), words("job.json out.rep points.csv t.xml")) << signal;
+    }
+}
+
+/// Runs the program with a pipe for standard output, whose reader goes as soon as a part of the work is done.
+ProgramRun runUntilReaderGoes(const QString &folder, const char *line, bool isIgnored)
+{
+    int ends[2] = {-1, -1};
+    EXPECT_EQ(pipe(ends), 0);
+    QProcess process;
+    process.setWorkingDirectory(folder);
+    process.setChildProcessModifier([&ends, isIgnored] {
+        dup2(ends[1], STDOUT_FILENO);
+        close(ends[0]);
+        close(ends[1]);
+        std::signal(SIGPIPE, isIgnored ? SIG_IGN : SIG_DFL);
+    });
+    process.start(QStringLiteral(KAREPORT_PROGRAM), words(line), QIODevice::ReadOnly);
+    process.setReadChannel(QProcess::StandardError);
+    QByteArray err;
+    while (furthestIn(err) == 0 && process.waitForReadyRead(30'000)) {
+        err += process.readAllStandardError();
+    }
+    close(ends[1]);
+    close(ends[0]);
+    ProgramRun run = endOf(process);
+    run.err.prepend(err);
+    return run;
+}
+
+TEST(CommandLineStream, TheWorkEndsSoonAfterTheReaderOfStandardOutputGoes)
+{
+    const LongJob folder("-");
+    for (const bool isIgnored : {false, true}) {
+        const ProgramRun run = runUntilReaderGoes(folder.path(), "render job.json --progress", isIgnored);
+        EXPECT_EQ(run.signal, isIgnored ? 0 : SIGPIPE) << run.all().constData();
+        EXPECT_EQ(run.status, isIgnored ? 3 : -1) << "where the caller has switched the signal off";
+        EXPECT_GT(furthestIn(run.err), 0);
+        EXPECT_LT(furthestIn(run.err), 60) << "the rest of the rows was not read for nothing";
     }
 }
 
