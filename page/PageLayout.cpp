@@ -1,5 +1,6 @@
 #include "PageLayout.h"
 
+#include "DefaultPrinter.h"
 #include "Preferences.h"
 #include "Profile.h"
 #include "ReportMargins.h"
@@ -15,10 +16,14 @@ const QString marginsEntry = QStringLiteral("Report Margins");
 
 } // namespace
 
-bool PageLayout::measure()
+std::optional<PageDevice> reportPageDevice()
 {
     const auto orientation = reportOrientation();
-    const auto device = defaultPageDevice(UPreviewDlg::IsModulePrinterOrientationPortrait());
+    return pageDevice(defaultPrinter(), UPreviewDlg::IsModulePrinterOrientationPortrait());
+}
+
+bool PageLayout::measure(const std::optional<PageDevice> &device)
+{
     if (!device) {
         return false;
     }

@@ -24,9 +24,9 @@ public:
 
     const PageGeometry &geometry() const { return geometry_; }
 
-    /// Measures the page on the default printer, as the user has reports printed, upright or not; the figures that were
-    /// given stay. @return false, with the figures as they were, without a printer
-    bool measure();
+    /// Measures the page on a printer; the figures that were given stay. @return false, with the figures as they were,
+    /// without a printer
+    bool measure(const std::optional<PageDevice> &device);
 
     /// Gives the lines of a page or the characters of a row (1 or more) in the place of what is measured. With both, no font
     /// is measured. What is not given is measured again by the next `measure`.
@@ -50,5 +50,8 @@ private:
     std::optional<int> givenCharsPerRow_;
     bool usesGiven_ = true;
 };
+
+/// The default printer, as the user has reports printed, upright or not.
+KAREPORT_EXPORT std::optional<PageDevice> reportPageDevice();
 
 } // namespace kareport

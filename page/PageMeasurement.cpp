@@ -42,21 +42,37 @@ QPageSize::PageSizeId sheetOf(PaperSize paper)
     return QLocale::system().measurementSystem() == QLocale::ImperialUSSystem ? QPageSize::Letter : QPageSize::A4;
 }
 
-PageDevice builtInDevice(bool portrait)
+PageDevice builtInDevice(const DefaultPrinter &printer, bool portrait)
 {
-    const DefaultPrinter &printer = defaultPrinter();
     // Not QPageSize::sizePixels: it counts in whole points, which is several dots off at a printer's resolution.
-    const QSizeF millimetres = builtInSheet().size(QPageSize::Millimeter);
+    const QSizeF millimetres = QPageSize(sheetOf(printer.paper)).size(QPageSize::Millimeter);
     const QSize upright = (millimetres * printer.resolution / millimetresPerInch).toSize();
     return {portrait ? upright : upright.transposed(), printer.resolution};
 }
 
-PageDevice printerDevice(const QPrinterInfo &info, bool portrait)
+void setSheet(QPrinter &printer, const QSize &sheet)
+{
+    if (!sheet.isEmpty()) {
+        printer.setPageSize(QPageSize(sheet));
+    }
+}
+
+PageDevice installedDevice(const QPrinterInfo &info, const QSize &sheet, bool portrait)
 {
     QPrinter printer(info, QPrinter::HighResolution);
-    setSelectedSheet(printer);
+    setSheet(printer, sheet);
     printer.setPageOrientation(portrait ? QPageLayout::Portrait : QPageLayout::Landscape);
     return {printer.pageLayout().fullRectPixels(printer.resolution()).size(), printer.resolution()};
+}
+
+QPrinterInfo installedPrinter(const DefaultPrinter &printer)
+{
+    if (printer.source != PrinterSource::SystemOrBuiltIn) {
+        return QPrinterInfo();
+    }
+    const QPrinterInfo selected = QPrinterInfo::printerInfo(printer.name);
+    // A selected printer that is no longer installed leaves the system's.
+    return selected.isNull() ? QPrinterInfo::defaultPrinter() : selected;
 }
 
 } // namespace
@@ -83,12 +99,7 @@ PageGeometry measurePage(const PageDevice &device, const QMargins &margins, cons
 
 QPrinterInfo applicationPrinter()
 {
-    if (defaultPrinter().source != PrinterSource::SystemOrBuiltIn) {
-        return QPrinterInfo();
-    }
-    const QPrinterInfo selected = QPrinterInfo::printerInfo(defaultPrinter().name);
-    // A selected printer that is no longer installed leaves the system's.
-    return selected.isNull() ? QPrinterInfo::defaultPrinter() : selected;
+    return installedPrinter(defaultPrinter());
 }
 
 QPageSize builtInSheet()
@@ -98,20 +109,16 @@ QPageSize builtInSheet()
 
 void setSelectedSheet(QPrinter &printer)
 {
-    if (const QSize sheet = defaultPrinter().sheet; !sheet.isEmpty()) {
-        printer.setPageSize(QPageSize(sheet));
-    }
+    setSheet(printer, defaultPrinter().sheet);
 }
 
-std::optional<PageDevice> defaultPageDevice(bool portrait)
+std::optional<PageDevice> pageDevice(const DefaultPrinter &printer, bool portrait)
 {
-    switch (defaultPrinter().source) {
-    case PrinterSource::None: return std::nullopt;
-    case PrinterSource::BuiltIn: return builtInDevice(portrait);
-    case PrinterSource::SystemOrBuiltIn: break;
+    if (printer.source == PrinterSource::None) {
+        return std::nullopt;
     }
-    const QPrinterInfo info = applicationPrinter();
-    return info.isNull() ? builtInDevice(portrait) : printerDevice(info, portrait);
+    const QPrinterInfo info = installedPrinter(printer);
+    return info.isNull() ? builtInDevice(printer, portrait) : installedDevice(info, printer.sheet, portrait);
 }
 
 FontExtents measureFont(const QString &face, unsigned points, int resolution)

@@ -16,6 +16,8 @@ class QPrinterInfo;
 namespace kareport
 {
 
+struct DefaultPrinter;
+
 /// The sheet that a printer prints on.
 struct PageDevice
 {
@@ -47,8 +49,8 @@ KAREPORT_EXPORT int mulDiv(int a, int b, int c);
 /// printable part.
 KAREPORT_EXPORT PageGeometry measurePage(const PageDevice &device, const QMargins &margins, const FontExtents &font);
 
-/// The application's default printer, upright or not; nothing when there is none.
-KAREPORT_EXPORT std::optional<PageDevice> defaultPageDevice(bool portrait);
+/// A printer, upright or not; nothing when there is none.
+KAREPORT_EXPORT std::optional<PageDevice> pageDevice(const DefaultPrinter &printer, bool portrait);
 
 /// The installed printer that the application prints on: the one that the user has selected, or the system's default. Null
 /// when there is none, or when the host has not chosen the system's printers.

@@ -2,10 +2,13 @@
 
 #include "PageLayout.h"
 #include "PageWriter.h"
+#include "ReportSurroundings.h"
 #include "ReportTemplate.h"
 #include "TextMirrors.h"
 
 #include <QString>
+
+#include <optional>
 
 class UDocument;
 
@@ -17,6 +20,15 @@ namespace kareport
 struct ReportParts
 {
     explicit ReportParts(UDocument &document) : mirrors(document), page(&mirrors) {}
+
+    /// What the page is measured on; nothing without a printer.
+    std::optional<PageDevice> pageDevice() const
+    {
+        return surroundings ? kareport::pageDevice(surroundings->printer, surroundings->isPortrait)
+                            : reportPageDevice();
+    }
+
+    std::optional<ReportSurroundings> surroundings; ///< nothing while those of the program hold
 
     // Text and pages
     TextMirrors mirrors;

@@ -4,6 +4,8 @@
 
 #include <QDir>
 
+#include <algorithm>
+
 namespace kareport
 {
 
@@ -20,16 +22,20 @@ QString fileIn(QString folder, const QString &fileName)
 
 } // namespace
 
-bool ReportTemplate::load(const QString &fileName, const QString &templateName, const QString &tableName,
+QStringList templatePaths(const QString &fileName)
+{
+    return {fileIn(GetLibraryDir(false), fileName), fileIn(GetStartPathName(), fileName)};
+}
+
+bool ReportTemplate::load(const QStringList &paths, const QString &templateName, const QString &tableName,
                           const QString &blockName)
 {
     // The handles point into the template that goes: they go with it.
     table_.reset();
     block_.reset();
     template_ = std::make_unique<UXmlReportTpl>();
-    if (!template_->LoadTemplate(fileIn(GetLibraryDir(false), fileName), templateName) &&
-        !template_->LoadTemplate(fileIn(GetStartPathName(), fileName), templateName))
-    {
+    const auto hasTemplate = [&](const QString &path) { return template_->LoadTemplate(path, templateName); };
+    if (std::none_of(paths.begin(), paths.end(), hasTemplate)) {
         return false;
     }
     pageBreaks = template_->GetPageBreakXmlOption();

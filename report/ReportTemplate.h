@@ -7,8 +7,10 @@
 #include "UXmlReportTpl.h"
 
 #include <QString>
+#include <QStringList>
 
 #include <memory>
+#include <optional>
 
 namespace kareport
 {
@@ -25,10 +27,12 @@ public:
     bool pageBreaks = true;               ///< the option of the template that was loaded last
     bool zeroBlank = false;               ///< values of zero show as blanks
     static inline bool printHash = false; ///< values wider than their column show as "#": one setting for all reports
+    std::optional<bool> ownPrintHash;     ///< in the place of that; nothing for none
 
-    /// Loads a template from a file of the library folder or, failing that, of the start folder, and then the table and the
-    /// block unless their names are empty. @return false when one of them cannot be loaded
-    bool load(const QString &fileName, const QString &templateName, const QString &tableName, const QString &blockName);
+    /// Loads a template from the first of the files that has it, and then the table and the block unless their names are
+    /// empty. @return false when one of them cannot be loaded
+    bool load(const QStringList &paths, const QString &templateName, const QString &tableName,
+              const QString &blockName);
     /// Loads a table, or a block, of the template. @return false without a template, or when it has none of the name
     bool loadTable(const QString &name);
     bool loadBlock(const QString &name);
@@ -39,12 +43,15 @@ public:
     const UXmlReportBlock *block() const { return block_.get(); }
 
     /// How values become texts. It points into this object.
-    FormatOptions formatOptions() const { return {&settings, separator, zeroBlank, printHash}; }
+    FormatOptions formatOptions() const { return {&settings, separator, zeroBlank, ownPrintHash.value_or(printHash)}; }
 
 private:
     std::unique_ptr<UXmlReportTpl> template_;
     std::unique_ptr<UXmlReportTable> table_; ///< a handle into the template, as the block is
     std::unique_ptr<UXmlReportBlock> block_;
 };
+
+/// Where a template file of a name may be, in the order that counts: in the library folder and in the start folder.
+QStringList templatePaths(const QString &fileName);
 
 } // namespace kareport

@@ -36,6 +36,19 @@ UReportDoc::UReportDoc(const QString &name, bool externalEditor, bool closeDocum
     if (!printHash.isEmpty()) {
         kareport::ReportTemplate::printHash = kareport::leadingInteger(printHash) != 0;
     }
+    enter();
+}
+
+UReportDoc::UReportDoc(const kareport::ReportSurroundings &surroundings)
+    : parts_(std::make_unique<kareport::ReportParts>(*this))
+{
+    SetSurroundings(surroundings);
+    SetHeader();
+    enter();
+}
+
+void UReportDoc::enter()
+{
     parts_->chainageLabel = Xlate("Station");
     UReportMgr.emplace(this, true); // nothing after it can fail: what is entered is alive
 }
@@ -60,4 +73,14 @@ QString UReportDoc::GetDocId() const
 bool UReportDoc::IsThatDocId(const QString &) const
 {
     return false;
+}
+
+void UReportDoc::SetSurroundings(const std::optional<kareport::ReportSurroundings> &surroundings)
+{
+    parts_->surroundings = surroundings;
+    parts_->data.ownPrintHash = surroundings ? std::optional(surroundings->printHash) : std::nullopt;
+    if (surroundings) {
+        parts_->layout.margins = surroundings->margins;
+        parts_->layout.fontSize = surroundings->fontSize;
+    }
 }

@@ -31,6 +31,7 @@ struct LoadedText;
 struct PdfNotes;
 struct ReportPage;
 struct ReportParts;
+struct ReportSurroundings;
 } // namespace kareport
 
 /// A report: fixed-pitch text laid out in pages and lines, written by host code or through a template.
@@ -51,6 +52,8 @@ public:
     ///                        owned and must outlive the report
     UReportDoc(const QString &name, bool externalEditor, bool closeDocument, UDocument *owner);
     UReportDoc();
+    /// A report that asks nobody: its surroundings are given, and hold until others are.
+    explicit UReportDoc(const kareport::ReportSurroundings &surroundings);
     ~UReportDoc() override;
 
     /// Whether a pointer is a report that is still alive.
@@ -198,6 +201,10 @@ public:
     void LoadSettings();
     /// Writes the margins to the user's preferences.
     void SaveSettings();
+    /// Lets what is given hold for the report in the place of the application's name, its clock, the default printer, the
+    /// user's preferences and the setting for wide values; margins and font size are taken over. Nothing lets the program's
+    /// own hold again: margins and font size then stay. Neither measures the page.
+    void SetSurroundings(const std::optional<kareport::ReportSurroundings> &surroundings);
 
     // --- Templates and data: UReportDocTemplate.cpp -----------------------------------------------------------------
 
@@ -208,6 +215,9 @@ public:
     ///         block cannot be loaded
     bool LoadTemplateXml(const QString &fileName, const QString &templateName, const QString &tableName,
                          const QString &blockName);
+    /// The same from the file at a path.
+    bool LoadTemplateFile(const QString &path, const QString &templateName, const QString &tableName,
+                          const QString &blockName);
     /// Loads a table, or a block, of the loaded template in the place of the one before, which is gone also when this
     /// fails. @return false without a template, when it has no such table or block or not its dictionary, or without memory
     bool LoadTemplateTable(const QString &tableName);
@@ -388,6 +398,10 @@ public:
     bool EnableCloseOption() const;
 
 private:
+    void enter();
+    bool loadTemplate(const QStringList &paths, const QString &templateName, const QString &tableName,
+                      const QString &blockName);
+
     /// Every live report, with the value true.
     static std::unordered_map<const UReportDoc *, bool> UReportMgr;
 

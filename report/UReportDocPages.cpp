@@ -12,7 +12,7 @@
 
 int UReportDoc::SetPageSize()
 {
-    if (!kareport::whileMemoryLasts(false, [this] { return parts_->layout.measure(); })) {
+    if (!kareport::whileMemoryLasts(false, [this] { return parts_->layout.measure(parts_->pageDevice()); })) {
         return 0;
     }
     parts_->page.setLinesPerPage(GetLinesPerPage());

@@ -23,14 +23,25 @@ bool writeData(kareport::PageWriter &page, Work write)
 bool UReportDoc::LoadTemplateXml(const QString &fileName, const QString &templateName, const QString &tableName,
                                  const QString &blockName)
 {
-    return kareport::whileMemoryLasts(false, [&] {
-        if (!parts_->data.load(fileName, templateName, tableName, blockName)) {
-            return false;
-        }
-        const quint64 losses = parts_->page.losses();
-        SetTitle(parts_->data.loaded()->GetTemplateTitle());
-        return parts_->page.losses() == losses;
-    });
+    return kareport::whileMemoryLasts(
+        false, [&] { return loadTemplate(kareport::templatePaths(fileName), templateName, tableName, blockName); });
+}
+
+bool UReportDoc::LoadTemplateFile(const QString &path, const QString &templateName, const QString &tableName,
+                                  const QString &blockName)
+{
+    return kareport::whileMemoryLasts(false, [&] { return loadTemplate({path}, templateName, tableName, blockName); });
+}
+
+bool UReportDoc::loadTemplate(const QStringList &paths, const QString &templateName, const QString &tableName,
+                              const QString &blockName)
+{
+    if (!parts_->data.load(paths, templateName, tableName, blockName)) {
+        return false;
+    }
+    const quint64 losses = parts_->page.losses();
+    SetTitle(parts_->data.loaded()->GetTemplateTitle());
+    return parts_->page.losses() == losses;
 }
 
 bool UReportDoc::LoadTemplateTable(const QString &tableName)

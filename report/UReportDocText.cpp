@@ -145,9 +145,10 @@ void UReportDoc::WriteHeading()
 void UReportDoc::SetHeader()
 {
     parts_->page.losesNothing([this] {
-        parts_->page.setHeaderLine(kareport::pageHeaderLine(GetApplicationTitle(), parts_->title,
-                                                            kareport::currentTime(), Xlate("   Page:@@Report Header"),
-                                                            GetCharsPerRow()));
+        const auto &given = parts_->surroundings;
+        parts_->page.setHeaderLine(kareport::pageHeaderLine(
+            given ? given->application : GetApplicationTitle(), parts_->title,
+            given ? given->time : kareport::currentTime(), Xlate("   Page:@@Report Header"), GetCharsPerRow()));
     });
 }
 

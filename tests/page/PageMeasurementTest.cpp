@@ -10,9 +10,10 @@
 namespace
 {
 
-using kareport::defaultPageDevice;
+using kareport::DefaultPrinter;
 using kareport::measurePage;
 using kareport::mulDiv;
+using kareport::pageDevice;
 using kareport::PaperSize;
 using kareport::PrinterSource;
 
@@ -120,31 +121,28 @@ TEST(PageMeasurement, TheBuiltInDeviceIsTheWholeSheet)
         {PaperSize::A4, 1200, {9921, 14031}, "210 mm = 9921.3 dots, 297 mm = 14031.5 dots"},
     };
     for (const Row &row : rows) {
-        kareport::setDefaultPrinter({PrinterSource::BuiltIn, row.paper, row.resolution});
-        const auto portrait = defaultPageDevice(true);
+        const DefaultPrinter printer = {PrinterSource::BuiltIn, row.paper, row.resolution};
+        const auto portrait = pageDevice(printer, true);
         ASSERT_TRUE(portrait) << row.reason;
         EXPECT_EQ(portrait->size, row.upright) << row.reason;
         EXPECT_EQ(portrait->resolution, row.resolution) << row.reason;
-        const auto landscape = defaultPageDevice(false);
+        const auto landscape = pageDevice(printer, false);
         ASSERT_TRUE(landscape) << row.reason;
         EXPECT_EQ(landscape->size, row.upright.transposed()) << row.reason << ", lying";
         EXPECT_EQ(landscape->resolution, row.resolution) << row.reason << ", lying";
     }
-    kareport::setDefaultPrinter({});
 }
 
 TEST(PageMeasurement, AHostWithoutAPrinterHasNoPage)
 {
-    kareport::setDefaultPrinter({PrinterSource::None, PaperSize::A4, 600});
-    EXPECT_FALSE(defaultPageDevice(true));
-    EXPECT_FALSE(defaultPageDevice(false));
-    kareport::setDefaultPrinter({});
+    const DefaultPrinter none = {PrinterSource::None, PaperSize::A4, 600};
+    EXPECT_FALSE(pageDevice(none, true));
+    EXPECT_FALSE(pageDevice(none, false));
 }
 
 TEST(PageMeasurement, WhereNoPrinterIsInstalledTheBuiltInDeviceStandsIn)
 {
-    kareport::setDefaultPrinter({});
-    const auto device = defaultPageDevice(true);
+    const auto device = pageDevice({}, true);
     ASSERT_TRUE(device) << "a report always has a page";
     EXPECT_GT(device->resolution, 0);
     EXPECT_GT(device->size.height(), device->size.width());
