@@ -1,6 +1,6 @@
 #include "CsvReader.h"
 
-#include "PosixProcessorTime.h"
+#include "ProcessorTime.h"
 
 #include <benchmark/benchmark.h>
 

@@ -1,5 +1,5 @@
 #include "PdfExport.h"
-#include "PosixProcessorTime.h"
+#include "ProcessorTime.h"
 #include "Profile.h"
 #include "UReportDoc.h"
 

@@ -1,6 +1,6 @@
 #include "LinePager.h"
-#include "PosixProcessorTime.h"
 #include "PrintJob.h"
+#include "ProcessorTime.h"
 
 #include <QApplication>
 #include <QPainter>

@@ -2,7 +2,7 @@
 #include "Profile.h"
 #include "UReportDoc.h"
 
-#include "PosixProcessorTime.h"
+#include "ProcessorTime.h"
 
 #include <benchmark/benchmark.h>
 

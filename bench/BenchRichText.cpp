@@ -1,7 +1,7 @@
 #include "RichTextReader.h"
 #include "RichTextWriter.h"
 
-#include "PosixProcessorTime.h"
+#include "ProcessorTime.h"
 
 #include <benchmark/benchmark.h>
 

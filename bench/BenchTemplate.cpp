@@ -3,7 +3,7 @@
 #include <QFile>
 #include <QTemporaryFile>
 
-#include "PosixProcessorTime.h"
+#include "ProcessorTime.h"
 
 #include <benchmark/benchmark.h>
 #include <libxml/parser.h>

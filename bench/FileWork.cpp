@@ -8,7 +8,7 @@
 //
 // Prints the seconds and the peak memory of the process in KB.
 
-#include "PosixProcessorTime.h"
+#include "ProcessorTime.h"
 #include "Profile.h"
 #include "ReplaceFile.h"
 #include "UReportDoc.h"

@@ -5,7 +5,7 @@
 #include "DeskApplication.h"
 #include "DeskDialogs.h"
 #include "DeskFrame.h"
-#include "PosixThreadTime.h"
+#include "ProcessorTime.h"
 #include "Profile.h"
 #include "ReportEdit.h"
 #include "ReportEntry.h"

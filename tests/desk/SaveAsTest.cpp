@@ -2,8 +2,8 @@
 
 #include "DeskDialogs.h"
 #include "DeskFixture.h"
+#include "FileSizeLimit.h"
 #include "JobFolder.h"
-#include "PosixFileSizeLimit.h"
 #include "SaveDialog.h"
 #include "UReportWindowDlg.h"
 
@@ -296,7 +296,7 @@ TEST(SaveAs, AFullDiskIsSaid)
         UReportDoc *report = newReport(QString(100000, u'x'));
         desk.typed = {folder.path(name)};
         {
-            const PosixFileSizeLimit full(4096);
+            const FileSizeLimit full(4096);
             EXPECT_FALSE(report->DoSave(QString(), true)) << name;
         }
         ASSERT_EQ(desk.messages.size(), 1) << name;

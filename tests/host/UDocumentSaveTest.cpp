@@ -1,5 +1,5 @@
+#include "FileSizeLimit.h"
 #include "FrameFixture.h"
-#include "PosixFileSizeLimit.h"
 
 #include <QDir>
 #include <QTemporaryDir>
@@ -208,7 +208,7 @@ TEST(UDocumentSave, AFullDiskLeavesTheEarlierFileWhole)
         changed.document.content = QByteArray(row.size, 'x');
         bool saved = true;
         {
-            const PosixFileSizeLimit full(4096);
+            const FileSizeLimit full(4096);
             saved = changed.document.DoFileSave();
         }
         EXPECT_FALSE(saved) << row.reason;

@@ -3,7 +3,7 @@
 #include "ExampleReport.h"
 #include "PdfReadBack.h"
 #include "PrintFixture.h"
-#include "PrivateCupsPosix.h"
+#include "PrivateCups.h"
 
 #include <QFile>
 

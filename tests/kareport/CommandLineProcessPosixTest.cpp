@@ -1,5 +1,6 @@
-#include "ProgramPosix.h"
+#include "CommandLine.h"
 
+#include <csignal>
 #include <fcntl.h>
 #include <sys/resource.h>
 #include <sys/stat.h>
@@ -7,6 +8,7 @@
 
 #include <gtest/gtest.h>
 
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -14,6 +16,16 @@
 
 namespace
 {
+
+/// Runs the program in a folder, with what a caller in the system's own terms prepares in the new process.
+ProgramRun runPrepared(const QString &folder, const char *line, const std::function<void()> &prepare)
+{
+    QProcess process;
+    process.setWorkingDirectory(folder);
+    process.setChildProcessModifier(prepare);
+    process.start(QStringLiteral(KAREPORT_PROGRAM), words(line), QIODevice::ReadOnly);
+    return endOf(process);
+}
 
 TEST(CommandLineProcess, NoFileTakesTheNumberOfAClosedDescriptor)
 {

@@ -1,10 +1,10 @@
 #include "PrintJob.h"
 
+#include "FileSizeLimit.h"
 #include "NumberedPages.h"
 #include "PagedText.h"
-#include "PosixFileSizeLimit.h"
 #include "PrintQt.h"
-#include "PrivateCupsPosix.h"
+#include "PrivateCups.h"
 
 #include <QApplication>
 #include <QElapsedTimer>
@@ -133,7 +133,7 @@ TEST(PrintQueuePosix, APrintServerThatGoesAwayInTheMiddleIsReported)
 
 TEST(PrintJobPosix, AFullDiskLeavesTheFileAsItWas)
 {
-    for (const rlim_t limit : {rlim_t(100), rlim_t(20'000)}) {
+    for (const quint64 limit : {quint64(100), quint64(20'000)}) {
         PagedText text;
         QFile earlier(text.file());
         ASSERT_TRUE(earlier.open(QIODevice::WriteOnly));
@@ -142,7 +142,7 @@ TEST(PrintJobPosix, AFullDiskLeavesTheFileAsItWas)
         NumberedPages pages(300);
         PrintOutcome outcome;
         {
-            const PosixFileSizeLimit full(limit);
+            const FileSizeLimit full(limit);
             outcome = kareport::printPages(text.printer(), pages.source, nullptr);
         }
         EXPECT_EQ(outcome.result, PrintResult::Failed) << limit;

@@ -1,7 +1,7 @@
 #include "ReplaceFile.h"
 
+#include "FileSizeLimit.h"
 #include "FrameFixture.h"
-#include "PosixFileSizeLimit.h"
 #include "ReportFixture.h"
 
 #include <QDir>
@@ -35,7 +35,7 @@ qsizetype filesIn(const QTemporaryDir &folder)
 struct Disk
 {
     qsizetype size;
-    rlim_t limit;
+    quint64 limit;
     bool fits;
     const char *reason;
 };
@@ -55,7 +55,7 @@ TEST(ReplaceFilePosix, AFullDiskLeavesTheOldFile)
         QString error;
         bool done = false;
         {
-            const PosixFileSizeLimit limit(disk.limit);
+            const FileSizeLimit limit(disk.limit);
             done = kareport::replaceFile(
                 path, [&](QIODevice &device) { return device.write(QByteArray(disk.size, 'x')) == disk.size; }, &error);
         }
@@ -76,7 +76,7 @@ TEST(ReplaceFilePosix, AReportThatDoesNotFitOnTheDiskStaysModified)
         ASSERT_TRUE(report.Write(QString(disk.size - 3, u'x'), 0)); // behind the mark of three bytes
         bool saved = false;
         {
-            const PosixFileSizeLimit limit(disk.limit);
+            const FileSizeLimit limit(disk.limit);
             saved = report.OnSaveDocument(path);
         }
         EXPECT_EQ(saved, disk.fits) << disk.reason;

@@ -1,4 +1,4 @@
-#include "PosixFileSizeLimit.h"
+#include "FileSizeLimit.h"
 #include "ReportEditorFixture.h"
 
 #include <gtest/gtest.h>
@@ -17,7 +17,7 @@ TEST_F(UReportDocEditorClose, WhatTheEditorDidNotGetStaysOpen)
         report->SetCloseDocumentFlag(true);
         empty->SetCloseDocumentFlag(true);
         {
-            const PosixFileSizeLimit fullDisk(0);
+            const FileSizeLimit fullDisk(0);
             report->UpdateAllViews(nullptr);
             ASSERT_TRUE(UReportDoc::IsReportAvailable(report)) << name << ": it is nowhere else";
             EXPECT_TRUE(report->IsModified()) << name;

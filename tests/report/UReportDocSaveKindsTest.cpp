@@ -1,5 +1,5 @@
+#include "FileSizeLimit.h"
 #include "FrameFixture.h"
-#include "PosixFileSizeLimit.h"
 #include "ReportFixture.h"
 
 #include <QDir>
@@ -104,7 +104,7 @@ TEST(UReportDocSaveKinds, AFullDiskLeavesTheEarlierFileWhole)
             report->WriteLine(QString(size, u'x'), 0, 1, 0);
             bool saved = true;
             {
-                const PosixFileSizeLimit full(4096);
+                const FileSizeLimit full(4096);
                 saved = report->OnSaveDocument(path);
             }
             EXPECT_FALSE(saved) << name.toStdString() << size;

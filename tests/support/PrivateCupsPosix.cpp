@@ -1,4 +1,4 @@
-#include "PrivateCupsPosix.h"
+#include "PrivateCups.h"
 
 PrivateCups::PrivateCups()
 {

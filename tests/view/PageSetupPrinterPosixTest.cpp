@@ -3,7 +3,7 @@
 #include "PdfReadBack.h"
 #include "PrintFixture.h"
 #include "PrintGeometry.h"
-#include "PrivateCupsPosix.h"
+#include "PrivateCups.h"
 
 #include <QFile>
 
