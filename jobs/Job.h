@@ -8,6 +8,7 @@
 
 #include <QDateTime>
 #include <QHash>
+#include <QJsonObject>
 #include <QMargins>
 #include <QString>
 
@@ -31,10 +32,13 @@ struct Job
         std::optional<int> fontSize; ///< points
         std::optional<int> linesPerPage;
         std::optional<int> charsPerRow;
+
+        /// Whether the page is given. Any other is measured with a font, which needs a running QGuiApplication.
+        bool isFixed() const { return linesPerPage && charsPerRow; }
     };
     struct Template
     {
-        QString file;
+        QString file; ///< the job's own, or else an installed one
         QString name;
     };
     struct Options
@@ -97,7 +101,6 @@ struct Job
         JsonPath path; ///< in the job file, for messages
     };
 
-    QString folder; ///< the job file's
     std::optional<QString> title;
     QString application = QStringLiteral("TALVEN");
     bool header = true;
@@ -109,6 +112,19 @@ struct Job
     QHash<QString, DataSet> data;
     std::vector<Step> steps;
     std::vector<Output> outputs;
+};
+
+/// The short form of a job: a data file written through one table or block of a template.
+struct TemplateJob
+{
+    QString templateFile;
+    QString templateName;
+    QString table; ///< or a block
+    QString block;
+    QString data; ///< a CSV file
+
+    /// The content of the job file that it stands for.
+    QJsonObject toJson() const;
 };
 
 } // namespace kareport

@@ -1,13 +1,15 @@
 #include "JobReader.h"
 
 #include "ApplicationTitle.h"
+#include "JobSettings.h"
+#include "JobStepsReader.h"
+#include "JsonNode.h"
 #include "Xlate.h"
 
 #include <QDir>
 #include <QFileInfo>
+#include <QJsonArray>
 #include <QStringList>
-
-#include <limits>
 
 namespace kareport
 {
@@ -15,7 +17,7 @@ namespace kareport
 namespace
 {
 
-constexpr int mostLines = 1'000'000; ///< of a page, and blank lines of a step
+constexpr int mostLines = 1'000'000; ///< of a page
 constexpr int mostMargin = 1'000'000;
 constexpr int mostFontSize = 1000;
 constexpr int mostResolution = 10'000;
@@ -157,105 +159,6 @@ QHash<QString, Job::DataSet> readData(const JsonNode &node, const QDir &folder)
     return sets;
 }
 
-int readLines(const JsonNode &node, int fallback)
-{
-    return node.whole(fallback, -mostLines, mostLines);
-}
-
-/// A line takes any style: one that rich text does not know stands in the plain text alone.
-int readStyle(const JsonNode &node)
-{
-    return node.whole(0, std::numeric_limits<int>::min(), std::numeric_limits<int>::max());
-}
-
-std::optional<Job::Step> readStep(const JsonNode &node)
-{
-    if (!node.expectObject()) {
-        return std::nullopt;
-    }
-    const auto step = [&](const char *key, auto action) -> std::optional<Job::Step> {
-        return Job::Step{action, node[QString::fromLatin1(key)].path()};
-    };
-    const int before = readLines(node["before"], 0);
-    if (node["heading"].exists()) {
-        node.allowOnly({"heading", "before", "after"});
-        return step("heading", Job::Heading{node["heading"].text(), before, readLines(node["after"], 0)});
-    }
-    if (node["line"].exists()) {
-        node.allowOnly({"line", "before", "after", "style"});
-        return step("line",
-                    Job::Line{node["line"].text(), before, readLines(node["after"], 1), readStyle(node["style"])});
-    }
-    if (node["lineFeed"].exists()) {
-        node.allowOnly({"lineFeed"});
-        return step("lineFeed", Job::LineFeed{readLines(node["lineFeed"], 0)});
-    }
-    if (node["newPage"].exists()) {
-        node.allowOnly({"newPage"});
-        return step("newPage", Job::NewPage{readLines(node["newPage"], 0)});
-    }
-    if (node["block"].exists()) {
-        node.allowOnly({"block", "data", "before", "after"});
-        return step("block",
-                    Job::Block{node["block"].text(), node["data"].text(), before, readLines(node["after"], 0)});
-    }
-    if (node["table"].exists()) {
-        node.allowOnly({"table", "data", "before", "after", "headingAfter"});
-        return step("table", Job::Table{node["table"].text(), node["data"].text(), before, readLines(node["after"], 0),
-                                        readLines(node["headingAfter"], -1)});
-    }
-    if (node["clear"].exists()) {
-        node.allowOnly({"clear"});
-        if (!node["clear"].boolean(true)) {
-            node["clear"].fail(Xlate("true was expected"));
-        }
-        return step("clear", Job::Clear{});
-    }
-    node.allowOnly({"heading", "line", "lineFeed", "newPage", "block", "table", "clear"});
-    node.fail(Xlate("a step was expected: one of heading, line, lineFeed, newPage, block, table, clear"));
-    return std::nullopt;
-}
-
-/// The data set that a step shows, and the template that it is shown through, must be there.
-void checkStep(const JsonNode &node, const Job &job)
-{
-    for (const char *key : {"block", "table"}) {
-        if (!node[QString::fromLatin1(key)].exists()) {
-            continue;
-        }
-        if (!job.reportTemplate) {
-            node.fail(Xlate("a \"%1\" needs a template: the key \"template\" was expected in the job")
-                          .arg(QLatin1StringView(key)));
-        }
-        const JsonNode data = node["data"];
-        if (!data.exists()) {
-            node.fail(Xlate("the key \"data\" with the name of a data set was expected"));
-        } else if (!job.data.contains(data.text())) {
-            data.fail(Xlate("there is no data set named \"%1\" in the job").arg(data.text()));
-        }
-    }
-}
-
-std::vector<Job::Step> readSteps(const JsonNode &node, const Job &job)
-{
-    std::vector<Job::Step> steps;
-    if (!node.exists()) {
-        node.fail(Xlate("the key \"report\" with a list of steps was expected"));
-    }
-    if (!node.expectArray()) {
-        return steps;
-    }
-    for (qsizetype i = 0; i < node.size(); ++i) {
-        const auto step = readStep(node[i]);
-        checkStep(node[i], job);
-        if (!step) {
-            break;
-        }
-        steps.push_back(*step);
-    }
-    return steps;
-}
-
 std::optional<Output> readOutput(const JsonNode &node, const QDir &folder, std::optional<OutputKind> otherwise)
 {
     if (node.value().isObject()) {
@@ -281,14 +184,48 @@ std::optional<Output> readOutput(const JsonNode &node, const QDir &folder, std::
     return Output{name == u"-" ? name : folder.filePath(name), *kind};
 }
 
-} // namespace
-
-Job readJob(JsonSource &source, std::optional<OutputKind> kindOtherwise, const JobDefaults &defaults)
+/// The time on the clock that a job fixes.
+std::optional<QDateTime> readTime(const JsonNode &node)
 {
-    const JsonNode root(source);
-    const QDir folder = source.path().isEmpty() ? QDir::current() : QFileInfo(source.path()).absoluteDir();
+    if (!node.exists()) {
+        return std::nullopt;
+    }
+    // The hands of a clock, without a zone: a time that a zone's summer time leaves out is one all the same.
+    QDateTime time = QDateTime::fromString(node.text() + u'Z', Qt::ISODate);
+    if (!time.isValid()) {
+        time = QDateTime::fromString(node.text(), Qt::ISODate);
+    }
+    if (!time.isValid()) {
+        node.fail(Xlate("a date and time such as 2024-03-05T14:07:00 was expected"));
+    }
+    return time;
+}
+
+/// The job's own template file wins over an installed one of the same name.
+QString templatePath(const QString &name, const QDir &folder, const QDir &installed)
+{
+    const QString own = folder.filePath(name);
+    const QString other = installed.filePath(name);
+    return QFileInfo::exists(own) || !QFileInfo::exists(other) ? own : other;
+}
+
+std::optional<Job::Template> readTemplate(const JsonNode &node, const QDir &folder, const QDir &installed)
+{
+    if (!node.expectObject()) {
+        return std::nullopt;
+    }
+    node.allowOnly({"file", "name"});
+    for (const char *key : {"file", "name"}) {
+        if (node[QString::fromLatin1(key)].text().isEmpty()) {
+            node.fail(Xlate("the key \"%1\" with a text was expected").arg(QLatin1StringView(key)));
+        }
+    }
+    return Job::Template{templatePath(readFileName(node["file"]), folder, installed), node["name"].text()};
+}
+
+Job readRoot(const JsonNode &root, const QDir &folder, const JobDefaults &defaults)
+{
     Job job;
-    job.folder = folder.path();
     root.allowOnly({"title", "application", "header", "now", "page", "settings", "template", "options", "data",
                     "report", "output"});
     if (const JsonNode title = root["title"]; title.exists()) {
@@ -301,38 +238,48 @@ Job readJob(JsonSource &source, std::optional<OutputKind> kindOtherwise, const J
         }
     }
     job.header = root["header"].boolean(true);
-    if (const JsonNode now = root["now"]; now.exists()) {
-        // The hands of a clock, without a zone: a time that a zone's summer time leaves out is one all the same.
-        job.now = QDateTime::fromString(now.text() + u'Z', Qt::ISODate);
-        if (!job.now->isValid()) {
-            job.now = QDateTime::fromString(now.text(), Qt::ISODate);
-        }
-        if (!job.now->isValid()) {
-            now.fail(Xlate("a date and time such as 2024-03-05T14:07:00 was expected"));
-        }
-    }
+    job.now = readTime(root["now"]);
     job.page = readPage(root["page"], defaults.page);
     job.settings = readSettings(root["settings"], defaults.settings);
-    if (const JsonNode node = root["template"]; node.expectObject()) {
-        node.allowOnly({"file", "name"});
-        for (const char *key : {"file", "name"}) {
-            if (node[QString::fromLatin1(key)].text().isEmpty()) {
-                node.fail(Xlate("the key \"%1\" with a text was expected").arg(QLatin1StringView(key)));
-            }
-        }
-        job.reportTemplate = Job::Template{readFileName(node["file"]), node["name"].text()};
-    }
+    job.reportTemplate = readTemplate(root["template"], folder, QDir(defaults.templateFolder));
     job.options = readOptions(root["options"]);
     job.data = readData(root["data"], folder);
     job.steps = readSteps(root["report"], job);
     if (const JsonNode outputs = root["output"]; outputs.expectArray()) {
         for (qsizetype i = 0; i < outputs.size(); ++i) {
-            if (const auto output = readOutput(outputs[i], folder, kindOtherwise)) {
+            if (const auto output = readOutput(outputs[i], folder, defaults.outputKind)) {
                 job.outputs.push_back(*output);
             }
         }
     }
     return job;
+}
+
+} // namespace
+
+Expected<Job> readJob(const JsonSource &source, const JobDefaults &defaults)
+{
+    std::optional<InputError> error;
+    const QDir folder = source.path().isEmpty() ? QDir::current() : QFileInfo(source.path()).absoluteDir();
+    Job job = readRoot(JsonNode(source, error), folder, defaults);
+    if (error) {
+        return *std::move(error);
+    }
+    return job;
+}
+
+QJsonObject TemplateJob::toJson() const
+{
+    const QString set = QStringLiteral("data");
+    const bool isTable = !table.isEmpty();
+    const QJsonObject step = {{isTable ? QStringLiteral("table") : QStringLiteral("block"), isTable ? table : block},
+                              {set, set}};
+    return {
+        {QStringLiteral("template"),
+         QJsonObject{{QStringLiteral("file"), templateFile}, {QStringLiteral("name"), templateName}}},
+        {set, QJsonObject{{set, QJsonObject{{QStringLiteral("csv"), data}}}}},
+        {QStringLiteral("report"), QJsonArray{step}},
+    };
 }
 
 } // namespace kareport

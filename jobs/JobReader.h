@@ -1,7 +1,10 @@
 #pragma once
 
+#include "Folders.h"
 #include "Job.h"
-#include "JsonNode.h"
+#include "JsonSource.h"
+
+#include <optional>
 
 namespace kareport
 {
@@ -9,19 +12,13 @@ namespace kareport
 /// What a job is made with where it does not say otherwise.
 struct JobDefaults
 {
-    UJobSettings settings;
-    Job::Page page;
+    UJobSettings settings = {};
+    Job::Page page = {};
+    std::optional<OutputKind> outputKind = std::nullopt; ///< of outputs whose names do not say it
+    QString templateFolder = GetLibraryDir(false); ///< has the template files that are not in the job's own folder
 };
 
-/// Reads a job file's content. What is wrong with it fails the source; the job that comes back then is no use.
-/// @param kindOtherwise  the kind of outputs whose names do not say it
-/// @param defaults       hold where the job sets nothing else
-Job readJob(JsonSource &source, std::optional<OutputKind> kindOtherwise = std::nullopt,
-            const JobDefaults &defaults = {});
-
-/// Reads the host's settings by their keys. @param settings  those whose keys are not given
-UJobSettings readSettings(const JsonNode &node, UJobSettings settings = {});
-/// Reads the units of a data set.
-DataUnits readDataUnits(const JsonNode &node);
+/// Reads a job file's content. @return the first thing that is wrong with it
+Expected<Job> readJob(const JsonSource &source, const JobDefaults &defaults = {});
 
 } // namespace kareport

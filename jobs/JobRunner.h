@@ -2,60 +2,52 @@
 
 #include "InputError.h"
 #include "Job.h"
-#include "JobSurroundings.h"
-#include "JsonNode.h"
+#include "JsonSource.h"
 #include "Progress.h"
-#include "UApplication.h"
+#include "ReportSurroundings.h"
 #include "UReportDoc.h"
 
 #include <functional>
-#include <memory>
 #include <optional>
 
 namespace kareport
 {
 
-/// Makes the report that a job describes: in the application where there is one, else without windows.
+/// What the report of a job is made in: the job says all of it, so that what is printed does not depend on the preferences,
+/// the printer and the clock of whoever runs it. A job without a time has that of a reproducible build, if one gives it
+/// (SOURCE_DATE_EPOCH), else the host's.
+ReportSurroundings surroundingsOf(const Job &job);
+
+/// Makes a report as a job describes it.
 class JobRunner
 {
 public:
-    /// Makes an empty report, whose title is set later. @return null when it cannot be made
-    using MakeReport = std::function<UReportDoc *(bool header)>;
+    /// @param source    the job file, for its values and for the places of errors
+    /// @param progress  shows how far reading the job's data has come
+    JobRunner(const Job &job, const JsonSource &source, Progress &progress)
+        : job_(job), source_(source), progress_(progress)
+    {}
 
-    /// @param source  the job file, for its values and for the places of errors
-    /// @param make    makes the report; empty for one in a pane of its own, where the application has panes
-    JobRunner(const Job &job, JsonSource &source, Progress &progress, MakeReport make = {});
-    ~JobRunner();
-
-    /// Whether a page has to be measured with a font, which needs a running QGuiApplication.
-    static bool needsFonts(const Job &job) { return !job.page.linesPerPage || !job.page.charsPerRow; }
-
-    /// @param stream  receives the text while it is written, where no step takes text back; null keeps it in the report. Once
-    ///                it has failed, no more is made
-    /// @return what is wrong with the job's template or data; nothing when the report has been made or was interrupted
-    std::optional<InputError> run(ReportTextWriter *stream = nullptr);
     /// Is asked now and then, besides the interrupts, whether the work is to stop.
     void stopWhen(std::function<bool()> isToStop) { isToStop_ = std::move(isToStop); }
-    UReportDoc &report() { return *report_; }
-    /// The same while it may not have been made: null then.
-    UReportDoc *madeReport() { return report_; }
+
+    /// Writes the job's report. Its surroundings are the job's until it has been written; then the program's hold for it.
+    /// @param report  a new one, which must stay open. In a program whose preferences must not matter it is made with
+    ///                `surroundingsOf` the job
+    /// @param stream  receives the text while it is written, where no step takes text back; null keeps it in the report.
+    ///                Once it has failed, no more is made
+    /// @return what is wrong with the job's template or data; nothing when the report has been made or the work was stopped
+    /// @throws std::bad_alloc when memory ends: half a report is none
+    std::optional<InputError> run(UReportDoc &report, ReportTextWriter *stream = nullptr);
 
 private:
-    class Steps;
-
-    std::optional<InputError> prepare();
-    std::optional<InputError> loadTemplate();
-    void applyOptions();
-    bool isStopped() const;
+    std::optional<InputError> prepare(UReportDoc &report);
+    std::optional<InputError> loadTemplate(UReportDoc &report);
+    void applyOptions(UReportDoc &report);
 
     const Job &job_;
-    JsonSource &source_;
+    const JsonSource &source_;
     Progress &progress_;
-    JobSurroundings surroundings_;
-    MakeReport make_;
-    std::optional<UApplication> application_; ///< of a program that has none
-    UReportDoc *report_ = nullptr;            ///< owned by its document template
-    ReportTextWriter *stream_ = nullptr;
     std::function<bool()> isToStop_;
 };
 

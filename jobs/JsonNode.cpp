@@ -2,210 +2,28 @@
 
 #include "Xlate.h"
 
-#include <QFile>
 #include <QJsonArray>
-#include <QJsonDocument>
 #include <QJsonObject>
 #include <QStringList>
 
 #include <algorithm>
 #include <cmath>
-#include <variant>
 
 namespace kareport
 {
-
-namespace
-{
-
-/// A larger file is taken for something else.
-constexpr qint64 largestJob = qint64(256) << 20;
-
-QString withDots(const JsonPath &path)
-{
-    QStringList steps;
-    for (const auto &step : path) {
-        if (const auto *name = std::get_if<QString>(&step)) {
-            steps.append(*name);
-        } else {
-            steps.append(QString::number(std::get<qsizetype>(step)));
-        }
-    }
-    return steps.join(u'.');
-}
-
-/// A longer key leads nowhere in a job, and each step costs a call.
-constexpr qsizetype mostSteps = 100;
-/// What a message shows of a text from the command line.
-constexpr qsizetype longestQuote = 100;
-
-QString quoteOf(const QString &text)
-{
-    return text.size() > longestQuote ? text.left(longestQuote) + u'…' : text;
-}
-
-/// A value from the command line: JSON where it is some, else the text itself. @return what is wrong with it
-std::variant<QJsonValue, QString> parsedOrText(const QString &text)
-{
-    QJsonParseError error{};
-    const QByteArray json = '[' + text.toUtf8() + ']';
-    const auto document = QJsonDocument::fromJson(json, &error);
-    if (error.error != QJsonParseError::NoError || document.array().size() != 1) {
-        return QJsonValue(text);
-    }
-    if (const auto repeated = findRepeatedKey(json)) {
-        return Xlate("the key \"%1\" stands twice in \"%2\"").arg(quoteOf(repeated->key), quoteOf(text));
-    }
-    return document.array().first();
-}
-
-/// The value with another one where the steps lead; nothing when they lead nowhere.
-std::optional<QJsonValue> withValueAt(const QJsonValue &value, const QStringList &steps, const QJsonValue &inner)
-{
-    if (steps.isEmpty()) {
-        return inner;
-    }
-    const QString &step = steps.first();
-    if (value.isArray()) {
-        QJsonArray array = value.toArray();
-        bool isIndex = false;
-        const int index = step.toInt(&isIndex);
-        if (!isIndex || index < 0 || index >= array.size()) {
-            return std::nullopt;
-        }
-        const auto changed = withValueAt(array.at(index), steps.mid(1), inner);
-        if (!changed) {
-            return std::nullopt;
-        }
-        array.replace(index, *changed);
-        return array;
-    }
-    if (!value.isObject() && !value.isUndefined()) {
-        return std::nullopt;
-    }
-    QJsonObject object = value.toObject();
-    const auto changed = withValueAt(object.value(step), steps.mid(1), inner);
-    if (!changed) {
-        return std::nullopt;
-    }
-    object.insert(step, *changed);
-    return object;
-}
-
-} // namespace
-
-Expected<JsonSource> JsonSource::read(const QString &path)
-{
-    QFile file(path);
-    if (!file.open(QIODevice::ReadOnly)) {
-        return InputError{path, std::nullopt, Xlate("the file cannot be read: %1").arg(file.errorString())};
-    }
-    // A pipe has no size, and may never end.
-    const qint64 size = file.size();
-    const QByteArray bytes = size > largestJob ? QByteArray() : file.read(size > 0 ? size : largestJob + 1);
-    if (std::max<qint64>(size, bytes.size()) > largestJob) {
-        return InputError{path, TextPlace(),
-                          Xlate("the file is larger than %1 MB: a job was expected").arg(largestJob >> 20)};
-    }
-    return fromBytes(path, bytes);
-}
-
-Expected<JsonSource> JsonSource::fromBytes(const QString &path, const QByteArray &bytes)
-{
-    QJsonParseError parseError{};
-    const auto document = QJsonDocument::fromJson(bytes, &parseError);
-    if (parseError.error != QJsonParseError::NoError) {
-        return InputError{path, placeOfByte(bytes, parseError.offset),
-                          Xlate("a JSON object was expected: %1").arg(parseError.errorString())};
-    }
-    if (!document.isObject()) {
-        return InputError{path, TextPlace(), Xlate("a JSON object was expected")};
-    }
-    if (const auto repeated = findRepeatedKey(bytes)) {
-        return InputError{path, repeated->place,
-                          Xlate("the key \"%1\" stands in line %2 already: each key was expected once")
-                              .arg(quoteOf(repeated->key), QString::number(repeated->firstLine))};
-    }
-    JsonSource source;
-    source.path_ = path;
-    source.bytes_ = bytes;
-    source.root_ = document.object();
-    return source;
-}
-
-JsonSource JsonSource::fromObject(const QJsonObject &object)
-{
-    JsonSource source;
-    source.root_ = object;
-    return source;
-}
-
-std::optional<QString> JsonSource::set(const QString &key, const QString &text)
-{
-    const QStringList steps = key.split(u'.');
-    if (steps.size() > mostSteps) {
-        return Xlate("the key \"%1\" has %2 steps: at most %3 were expected")
-            .arg(quoteOf(key), QString::number(steps.size()), QString::number(mostSteps));
-    }
-    const auto value = parsedOrText(text);
-    if (const auto *wrong = std::get_if<QString>(&value)) {
-        return *wrong;
-    }
-    const auto changed =
-        steps.contains(QString()) ? std::nullopt : withValueAt(root_, steps, std::get<QJsonValue>(value));
-    if (!changed) {
-        return Xlate("there is no place for the key \"%1\" in the job").arg(quoteOf(key));
-    }
-    root_ = *changed;
-    setTexts_.removeIf([inside = key + u'.'](const auto &given) { return given.key().startsWith(inside); });
-    setTexts_.insert(key, text);
-    return std::nullopt;
-}
-
-std::optional<QString> JsonSource::setText(const JsonPath &path) const
-{
-    const auto found = setTexts_.constFind(withDots(path));
-    return found == setTexts_.constEnd() ? std::nullopt : std::optional(*found);
-}
-
-void JsonSource::fail(const JsonPath &path, const QString &text, bool atKey)
-{
-    if (error_) {
-        return;
-    }
-    // What was set on the command line is not the file's fault.
-    for (JsonPath given = path; !given.empty(); given.pop_back()) {
-        if (const auto set = setText(given)) {
-            error_ = InputError{QStringLiteral("--set %1=%2").arg(withDots(given), *set), std::nullopt, text};
-            return;
-        }
-    }
-    if (bytes_.isEmpty()) {
-        error_ = InputError{path_, std::nullopt, text};
-        return;
-    }
-    // What is missing is missed where its parent stands.
-    JsonPath known = path;
-    auto place = placeInJson(bytes_, known, atKey);
-    while (!place && !known.empty()) {
-        known.pop_back();
-        place = placeInJson(bytes_, known);
-    }
-    error_ = InputError{path_, place, text};
-}
 
 JsonNode JsonNode::operator[](const QString &key) const
 {
     JsonPath path = path_;
     path.emplace_back(key);
-    return {source_, value_.toObject().value(key), std::move(path)};
+    return {*source_, *error_, value_.toObject().value(key), std::move(path)};
 }
 
 JsonNode JsonNode::operator[](qsizetype index) const
 {
     JsonPath path = path_;
     path.emplace_back(index);
-    return {source_, value_.toArray().at(index), std::move(path)};
+    return {*source_, *error_, value_.toArray().at(index), std::move(path)};
 }
 
 qsizetype JsonNode::size() const
@@ -220,7 +38,7 @@ QStringList JsonNode::keys() const
 
 bool JsonNode::isText() const
 {
-    return value_.isString() || (exists() && source_.setText(path_));
+    return value_.isString() || (exists() && source_->setText(path_));
 }
 
 QString JsonNode::text(const QString &fallback) const
@@ -228,7 +46,7 @@ QString JsonNode::text(const QString &fallback) const
     if (!exists()) {
         return fallback;
     }
-    if (const auto given = source_.setText(path_)) {
+    if (const auto given = source_->setText(path_)) {
         return value_.isString() ? value_.toString() : *given;
     }
     if (!value_.isString()) {
@@ -286,8 +104,7 @@ void JsonNode::allowOnly(std::initializer_list<const char *> allowed) const
                            [](const char *name) { return QString::fromLatin1(name); });
             JsonPath path = path_;
             path.emplace_back(key);
-            source_.fail(path, Xlate("unknown key \"%1\": %2 expected").arg(key, names.join(QStringLiteral(", "))),
-                         true);
+            failAt(path, Xlate("unknown key \"%1\": %2 expected").arg(key, names.join(QStringLiteral(", "))), true);
         }
     }
 }

@@ -5,6 +5,9 @@
 
 #include <QSet>
 
+#include <algorithm>
+#include <utility>
+
 namespace kareport
 {
 
@@ -43,6 +46,32 @@ void storeJsonObject(const JsonNode &node, const FindVariable &findVariable, UDa
             return;
         }
     }
+}
+
+JsonObjectList::JsonObjectList(const JsonSource &source, const JsonPath &path, const FindVariable &findVariable,
+                               bool firstOnly, ReadProgress progress)
+    : progress_(std::move(progress))
+{
+    JsonNode values(source, error_);
+    for (const auto &step : path) {
+        const auto *name = std::get_if<QString>(&step);
+        values = name != nullptr ? values[*name] : values[std::get<qsizetype>(step)];
+    }
+    if (values.isObject()) {
+        storeJsonObject(values, findVariable, Add());
+        return;
+    }
+    const qsizetype count = firstOnly ? std::min<qsizetype>(values.size(), 1) : values.size();
+    for (qsizetype i = 0; i < count && !error_; ++i) {
+        storeJsonObject(values[i], findVariable, Add());
+    }
+}
+
+UDataObject *JsonObjectList::GetAt(std::size_t index)
+{
+    constexpr std::size_t rowsBetween = 256;
+    const bool isEnd = index % rowsBetween == 0 && progress_ && !progress_(index);
+    return isEnd ? nullptr : UDataObjectList::GetAt(index);
 }
 
 } // namespace kareport

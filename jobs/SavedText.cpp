@@ -1,10 +1,75 @@
 #include "SavedText.h"
 
+#include "LineEndings.h"
 #include "PageHeader.h"
+#include "ReportTextDecoder.h"
+#include "RichTextReader.h"
 #include "UReportDoc.h"
+#include "Xlate.h"
+
+#include <QFile>
+#include <QFileInfo>
 
 namespace kareport
 {
+
+namespace
+{
+
+/// Reads a report file or plain text.
+Expected<SavedText> readPlain(const QString &path, QByteArrayView bytes)
+{
+    if (bytes.startsWith("%PDF")) {
+        return InputError{path, TextPlace(), Xlate("a saved report was expected; this is a PDF")};
+    }
+    SavedText saved;
+    if (const auto place = decodeReportText(bytes, saved.text)) {
+        return InputError{path, *place, Xlate("a report file was expected; this is no UTF-8")};
+    }
+    return saved;
+}
+
+Expected<SavedText> readRich(const QString &path, QByteArrayView bytes)
+{
+    SavedText saved;
+    RichTextNotes notes;
+    if (const auto error = readRichTextCharacters(bytes, saved.text, &notes)) {
+        return InputError{path, error->place, error->text};
+    }
+    for (QChar &character : saved.text) {
+        if (character == QChar::ParagraphSeparator || character == QChar::LineSeparator) {
+            character = u'\n';
+        }
+    }
+    if (!saved.text.isEmpty() && !saved.text.endsWith(u'\n')) {
+        saved.text += u'\n'; // the last paragraph is a line as well
+    }
+    saved.text = withCrLf(saved.text);
+    saved.warnings = notes.texts();
+    return saved;
+}
+
+} // namespace
+
+bool isPdfName(const QString &path)
+{
+    return path.endsWith(u".pdf", Qt::CaseInsensitive);
+}
+
+bool isPdfFile(const QString &path)
+{
+    constexpr char firstBytes[] = "%PDF-";
+    constexpr qint64 length = sizeof firstBytes - 1;
+    QFile file(path);
+    return isPdfName(path) ||
+           (QFileInfo(path).isFile() && file.open(QIODevice::ReadOnly) && file.read(length) == firstBytes);
+}
+
+Expected<SavedText> readSavedText(const QString &path, QByteArrayView bytes)
+{
+    const QByteArrayView richText = richTextIn(bytes);
+    return richText.isEmpty() ? readPlain(path, bytes) : readRich(path, richText);
+}
 
 std::optional<int> linesOfPages(QStringView text)
 {

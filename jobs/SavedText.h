@@ -1,5 +1,10 @@
 #pragma once
 
+#include "InputError.h"
+
+#include <QByteArrayView>
+#include <QString>
+#include <QStringList>
 #include <QStringView>
 
 #include <optional>
@@ -8,6 +13,21 @@ class UReportDoc;
 
 namespace kareport
 {
+
+/// Whether a name is that of a PDF.
+bool isPdfName(const QString &path);
+/// Whether a file is a PDF, by its name or by its first bytes. What is no file is not looked into.
+bool isPdfFile(const QString &path);
+
+/// What stands in a saved report.
+struct SavedText
+{
+    QString text;         ///< lines ended by CR LF
+    QStringList warnings; ///< sentences about what the text does not have of it
+};
+
+/// Reads the bytes of a saved report: of a report file, of rich text or of plain text. @param path  names the file in errors
+Expected<SavedText> readSavedText(const QString &path, QByteArrayView bytes);
 
 /// The lines of a page by a report's header lines, in whatever language they were written; nothing without any.
 std::optional<int> linesOfPages(QStringView text);

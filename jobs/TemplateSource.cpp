@@ -1,22 +1,13 @@
 #include "TemplateSource.h"
 
-#include "Folders.h"
 #include "TemplateCheck.h"
 #include "TemplateNames.h"
 #include "Xlate.h"
 
-#include <QDir>
 #include <QFileInfo>
 
 namespace kareport
 {
-
-QString templatePath(const Job &job)
-{
-    const QString own = QDir(job.folder).filePath(job.reportTemplate->file);
-    const QString installed = QDir(GetLibraryDir(false)).filePath(job.reportTemplate->file);
-    return QFileInfo::exists(own) || !QFileInfo::exists(installed) ? own : installed;
-}
 
 std::optional<InputError> wrongTemplateSource(const QString &path)
 {

@@ -1,7 +1,6 @@
 #pragma once
 
 #include "InputError.h"
-#include "Job.h"
 #include "TemplateFile.h"
 
 #include <optional>
@@ -11,9 +10,6 @@ namespace kareport
 
 /// A template file larger than this is taken for something else.
 inline constexpr qint64 largestTemplateFile = qint64(64) << 20;
-
-/// The template file of a job that has one. The job's own file wins over an installed one of the same name.
-QString templatePath(const Job &job);
 
 /// Whether a path can be a template file: what is wrong when it is none, or one that is far too large.
 std::optional<InputError> wrongTemplateSource(const QString &path);

@@ -14,7 +14,7 @@
 namespace kareport
 {
 
-/// Rows that were read one behind the other. The objects are kept and refilled from batch to batch.
+/// Rows that were read one after the other. The objects are kept and refilled from batch to batch.
 struct RowBatch
 {
     static constexpr std::size_t most = 2048;
@@ -23,10 +23,10 @@ struct RowBatch
     std::vector<UDataObject> objects; ///< as many as were ever in use
     std::size_t count = 0;            ///< objects in use
     bool isLast = false;              ///< no row follows, or none that can be read
-    std::optional<InputError> error;  ///< what is wrong with the row behind the last
+    std::optional<InputError> error;  ///< what is wrong with the row after the last
     std::size_t position = 0;         ///< where reading has come to in the file
 
-    /// The object behind those in use.
+    /// The object after those in use.
     UDataObject &next()
     {
         if (count == objects.size()) {

@@ -3,12 +3,12 @@
 #include "AppMessageBox.h"
 #include "Folders.h"
 #include "JobLauncher.h"
-#include "PdfFile.h"
 #include "PreferencesDialog.h"
 #include "ReportEntry.h"
 #include "ReportResources.h"
 #include "ReportSaveName.h"
 #include "SavedReports.h"
+#include "SavedText.h"
 #include "TemplateDialog.h"
 #include "UApplication.h"
 #include "UReportDoc.h"
@@ -103,10 +103,10 @@ DeskFrame::DeskFrame() : files_([this](const QString &path) { fileChanged(path);
     };
     loadLayout();
     UpdateCommands();
-    constexpr int closeInterval = 500; // milliseconds
-    auto *closeTimer = new QTimer(this);
-    connect(closeTimer, &QTimer::timeout, this, [this] { closeUnseen(); });
-    closeTimer->start(closeInterval);
+    constexpr int unseenInterval = 500; // milliseconds
+    auto *unseenTimer = new QTimer(this);
+    connect(unseenTimer, &QTimer::timeout, this, [this] { closeUnseen(); });
+    unseenTimer->start(unseenInterval);
     constexpr int recoveryInterval = 5000; // milliseconds
     auto *recoveryTimer = new QTimer(this);
     connect(recoveryTimer, &QTimer::timeout, this, [this] { recovery_.keep(); });
@@ -296,7 +296,7 @@ void DeskFrame::NoteDocumentEvent(UDocument &document, UDocument::DocumentEvent 
         recovery_.forget(dynamic_cast<const UReportDoc *>(&document));
         editors_.forget(dynamic_cast<const UReportDoc *>(&document));
     }
-    // A document that has just been opened or saved under a new name gets its path behind the event.
+    // A document that has just been opened or saved under a new name gets its path after the event.
     QMetaObject::invokeMethod(
         this,
         [this, event, &document] {

@@ -1,6 +1,6 @@
 #include "DeskPreferences.h"
 
-#include "JobSettingsWriter.h"
+#include "JobSettings.h"
 #include "PageDefaults.h"
 #include "Preferences.h"
 #include "Profile.h"
@@ -21,13 +21,14 @@ const QString languageEntry = QStringLiteral("Language");
 
 UJobSettings settingsFromText(const QString &text)
 {
-    auto read = JsonSource::fromBytes(settingsEntry, text.toUtf8());
-    auto *source = std::get_if<JsonSource>(&read);
+    const auto read = JsonSource::fromBytes(settingsEntry, text.toUtf8());
+    const auto *source = std::get_if<JsonSource>(&read);
     if (source == nullptr) {
         return {};
     }
-    const UJobSettings settings = readSettings(JsonNode(*source));
-    return source->failed() ? UJobSettings() : settings;
+    std::optional<InputError> error;
+    const UJobSettings settings = readSettings(JsonNode(*source, error));
+    return error ? UJobSettings() : settings;
 }
 
 } // namespace

@@ -5,7 +5,6 @@
 #include "Interrupt.h"
 #include "JobReader.h"
 #include "JobRunner.h"
-#include "Preferences.h"
 #include "Progress.h"
 #include "ReportWindow.h"
 #include "ReportWindowEntry.h"
@@ -69,30 +68,31 @@ void setWindowCaption(const UReportDoc &report, const QString &caption)
     }
 }
 
-/// A report that is shown in a report window while it is written.
+/// A report that is shown in a report window while it is written, whatever editor the user prefers.
 UReportDoc *makeShown(bool header, const QString &caption)
 {
     // The job gives the title.
-    UReportDoc *report = CreateReportWindow(QString(), header, GetUsePreferredReportEditorFlag() != 0);
+    UReportDoc *report = CreateReportWindow(QString(), header, false);
     if (report != nullptr) {
         setWindowCaption(*report, caption);
     }
     return report;
 }
 
-/// Says in a job which of its data files is none: reading a pipe or a device might never end, and nothing could stop it.
-void refuseWhatIsNoFile(const Job &job, JsonSource &source)
+/// Which data file of a job is none: reading a pipe or a device might never end, and nothing could stop it.
+std::optional<InputError> dataThatIsNoFile(const Job &job, const JsonSource &source)
 {
     QStringList names = job.data.keys();
     names.sort();
     for (const QString &name : names) {
         const QString &csv = job.data.constFind(name)->csv;
         if (QFileInfo(csv).exists() && !QFileInfo(csv).isFile()) {
-            JsonNode(source)["data"][name]["csv"].fail(
+            return source.errorAt(
+                {QStringLiteral("data"), name, QStringLiteral("csv")},
                 Xlate("the data file \"%1\" cannot be read: %2").arg(csv, Xlate("it is a folder, a pipe or a device")));
-            return;
         }
     }
+    return std::nullopt;
 }
 
 /// Ends rich-text mode, which belongs to the files of a job: while it is on, the view shows what was written, and neither
@@ -104,51 +104,53 @@ void endRichTextMode(UReportDoc *report)
     }
 }
 
-UReportDoc *runJob(Expected<JsonSource> read, QWidget *parent, QString &error)
+/// Runs a job that has been read. @return the report; null when it was not made
+UReportDoc *makeReport(const Job &job, const JsonSource &source, QWidget *parent, QString &error)
+{
+    DialogProgress progress(parent);
+    UReportDoc *report = makeShown(job.header, job.title.value_or(QFileInfo(source.path()).completeBaseName()));
+    if (report == nullptr) {
+        error = InputError{source.path(), std::nullopt, Xlate("the report could not be made")}.message();
+        return nullptr;
+    }
+    std::optional<InputError> wrong;
+    try {
+        wrong = JobRunner(job, source, progress).run(*report);
+    } catch (const std::bad_alloc &) {
+        endRichTextMode(report);
+        closeReport(report); // half a report is none
+        throw;
+    }
+    if (wrong) {
+        error = wrong->message();
+    }
+    endRichTextMode(report);
+    if (wrong || isInterrupted()) {
+        closeReport(report);
+        return nullptr;
+    }
+    setWindowCaption(*report, report->GetTitle());
+    report->SetReportWindowActive();
+    return report;
+}
+
+UReportDoc *runJob(const Expected<JsonSource> &read, QWidget *parent, QString &error)
 {
     if (const InputError *wrong = errorOf(read)) {
         error = wrong->message();
         return nullptr;
     }
-    auto &source = std::get<JsonSource>(read);
-    const Job job = readJob(source, std::nullopt, loadPreferences().jobDefaults());
-    if (!source.error()) {
-        refuseWhatIsNoFile(job, source);
-    }
-    if (source.error()) {
-        error = source.error()->message();
+    const auto &source = std::get<JsonSource>(read);
+    const auto job = readJob(source, loadPreferences().jobDefaults());
+    if (const InputError *wrong = errorOf(job)) {
+        error = wrong->message();
         return nullptr;
     }
-    DialogProgress progress(parent);
-    UReportDoc *report = nullptr;
-    bool isMade = false;
-    {
-        const QString caption = job.title.value_or(QFileInfo(source.path()).completeBaseName());
-        JobRunner runner(job, source, progress, [&caption](bool header) { return makeShown(header, caption); });
-        std::optional<InputError> wrong;
-        try {
-            wrong = runner.run();
-        } catch (const std::bad_alloc &) {
-            endRichTextMode(runner.madeReport());
-            closeReport(runner.madeReport()); // half a report is none
-            throw;
-        }
-        report = runner.madeReport();
-        if (wrong) {
-            error = wrong->message();
-        }
-        isMade = !wrong && !isInterrupted();
-    }
-    endRichTextMode(report);
-    if (!isMade) {
-        closeReport(report);
+    if (const auto wrong = dataThatIsNoFile(std::get<Job>(job), source)) {
+        error = wrong->message();
         return nullptr;
     }
-    if (report != nullptr) {
-        setWindowCaption(*report, report->GetTitle());
-        report->SetReportWindowActive();
-    }
-    return report;
+    return makeReport(std::get<Job>(job), source, parent, error);
 }
 
 template <typename Read>

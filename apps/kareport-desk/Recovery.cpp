@@ -1,10 +1,10 @@
 #include "Recovery.h"
 
 #include "MemoryLasts.h"
-#include "PdfFile.h"
 #include "ReportEntry.h"
 #include "ReportPages.h"
 #include "SavedReports.h"
+#include "SavedText.h"
 #include "TextFile.h"
 #include "UReportDoc.h"
 #include "UReportView.h"

@@ -4,7 +4,6 @@
 #include "LineEndings.h"
 #include "LoadedText.h"
 #include "MemoryLasts.h"
-#include "PdfFile.h"
 #include "ReportContent.h"
 #include "ReportEntry.h"
 #include "RichTextReader.h"

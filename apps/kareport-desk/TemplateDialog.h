@@ -1,6 +1,6 @@
 #pragma once
 
-#include "TemplateJob.h"
+#include "Job.h"
 
 #include <QDialog>
 

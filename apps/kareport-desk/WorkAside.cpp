@@ -128,16 +128,16 @@ void start(const std::shared_ptr<Waited> &state, std::function<void(AsideState &
 void waitFor(Waited &state, QEventLoop &loop, const QString &what, UserInput input)
 {
     WorkDialog dialog(UXTPMDIFrameWnd::Get(), [&state] { state.stop(); });
-    QTimer progressTimer; // also for who stops the work
-    QObject::connect(&progressTimer, &QTimer::timeout, &loop, [&] {
+    QTimer dueTimer; // shows the dialog in time, and sees that the work was stopped
+    QObject::connect(&dueTimer, &QTimer::timeout, &loop, [&] {
         if (state.isStopped() || (input == UserInput::Kept && dialog.isDue())) {
             loop.quit();
         } else if (dialog.isDue()) {
             dialog.show(what, state.percent());
         }
     });
-    constexpr int progressInterval = 50; // milliseconds
-    progressTimer.start(progressInterval);
+    constexpr int dueInterval = 50; // milliseconds
+    dueTimer.start(dueInterval);
     if (input == UserInput::Kept) {
         loop.exec(QEventLoop::ExcludeUserInputEvents);
         input = UserInput::Taken; // from now on by the dialog alone

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "Commands.h"
-#include "JsonNode.h"
+#include "JsonSource.h"
 
 #include <QCoreApplication>
 

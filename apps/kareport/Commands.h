@@ -1,6 +1,7 @@
 #pragma once
 
-#include "TemplateJob.h"
+#include "Job.h"
+#include "Printing.h"
 
 #include <QString>
 #include <QStringList>
@@ -89,9 +90,5 @@ struct ViewCommand
     /// Starts the desktop program and leaves it to itself.
     ExitStatus run(int &argc, char **argv) const;
 };
-
-/// Writes a line to standard output or standard error. Characters that would command a terminal are made visible.
-void printLine(const QString &line);
-void printError(const QString &line);
 
 } // namespace kareport

@@ -1,16 +1,13 @@
 #include "Commands.h"
 
+#include "CommandOutputs.h"
 #include "CommandSetup.h"
 #include "FileBytes.h"
 #include "FileIdentity.h"
+#include "JobFiles.h"
 #include "JobReader.h"
 #include "JobRunner.h"
-#include "LineEndings.h"
-#include "OutputClash.h"
-#include "OutputsWriter.h"
 #include "PageMeasurement.h"
-#include "ReportTextDecoder.h"
-#include "RichTextReader.h"
 #include "SavedText.h"
 #include "TerminalProgress.h"
 #include "Xlate.h"
@@ -25,42 +22,53 @@ namespace kareport
 namespace
 {
 
-/// What stands in a saved report.
-struct SavedReport
+/// What is wrong with an output that is the report that is read.
+std::optional<InputError> sameFile(const QString &input, const Output &output)
 {
-    QString text; ///< lines ended by CR LF
-    QStringList warnings;
-};
-
-/// Reads a report file or plain text. @return what is wrong with it; nothing when all was read
-std::optional<InputError> readText(const QString &path, QByteArrayView bytes, SavedReport &saved)
-{
-    if (bytes.startsWith("%PDF")) {
-        return InputError{path, TextPlace(), Xlate("a saved report was expected; this is a PDF")};
+    const QString identity = outputIdentity(output);
+    if (identity.isEmpty() || identity != fileIdentity(input)) {
+        return std::nullopt;
     }
-    if (const auto place = decodeReportText(bytes, saved.text)) {
-        return InputError{path, *place, Xlate("a report file was expected; this is no UTF-8")};
-    }
-    return std::nullopt;
+    return InputError{input, std::nullopt,
+                      Xlate("the output \"%1\" is the report that is read: another one was expected").arg(output.file)};
 }
 
-std::optional<InputError> readRichText(const QString &path, QByteArrayView bytes, SavedReport &saved)
+Expected<SavedText> readSavedFile(const QString &path)
 {
-    RichTextNotes notes;
-    if (const auto error = readRichTextCharacters(bytes, saved.text, &notes)) {
-        return InputError{path, error->place, error->text};
+    const auto file = FileBytes::open(path);
+    if (const InputError *error = errorOf(file)) {
+        return *error;
     }
-    for (QChar &character : saved.text) {
-        if (character == QChar::ParagraphSeparator || character == QChar::LineSeparator) {
-            character = u'\n';
-        }
+    const FileBytes &bytes = *std::get<std::shared_ptr<const FileBytes>>(file);
+    auto saved = readSavedText(path, QByteArrayView(bytes.view().data(), static_cast<qsizetype>(bytes.view().size())));
+    if (auto lost = bytes.lostBytes()) {
+        return *std::move(lost);
     }
-    if (!saved.text.isEmpty() && !saved.text.endsWith(u'\n')) {
-        saved.text += u'\n'; // the last paragraph is a line as well
+    return saved;
+}
+
+/// Fixes the page of a report that is written already. The pages of a PDF are those that it was written in; no other kind
+/// has pages.
+void fixPage(Job &job, const SavedText &saved)
+{
+    if (!job.page.linesPerPage) {
+        job.page.linesPerPage =
+            job.outputs.front().kind == OutputKind::Pdf ? linesOfPages(saved.text) : PageGeometry().linesPerPage;
     }
-    saved.text = withCrLf(saved.text);
-    saved.warnings = notes.texts();
-    return std::nullopt;
+    job.page.charsPerRow = job.page.charsPerRow.value_or(PageGeometry().charsPerRow);
+}
+
+void writeSaved(UReportDoc &report, const QString &text)
+{
+    if (report.GetRTFDataFlag()) {
+        writeLines(report, text);
+    } else {
+        report.Write(text, 0);
+    }
+    if (report.HasLostText()) {
+        throw std::bad_alloc();
+    }
+    report.FindPageStarts();
 }
 
 } // namespace
@@ -84,64 +92,31 @@ ExitStatus ConvertCommand::run(int &argc, char **argv) const
     if (const auto wrong = applySets(source, sets)) {
         return usageExit(*wrong);
     }
-    Job job = readJob(source, std::nullopt);
-    if (source.error()) {
-        return usageExit(source.error()->message());
+    auto read = readJob(source);
+    if (const InputError *error = errorOf(read)) {
+        return usageExit(error->message());
     }
+    Job &job = std::get<Job>(read);
     job.outputs = {{output, *outputKindOf(output, outputKindFromName(as))}};
-
-    const QString identity = outputIdentity(job.outputs.front());
-    if (!identity.isEmpty() && identity == fileIdentity(input)) {
-        printError(
-            InputError{input, std::nullopt,
-                       Xlate("the output \"%1\" is the report that is read: another one was expected").arg(output)}
-                .message());
+    if (const auto same = sameFile(input, job.outputs.front())) {
+        printError(same->message());
         return exitInput;
     }
-    auto file = FileBytes::open(input);
+    auto file = readSavedFile(input);
     if (const InputError *error = errorOf(file)) {
         printError(error->message());
         return exitInput;
     }
-    const std::string_view view = std::get<std::shared_ptr<const FileBytes>>(file)->view();
-    const QByteArrayView bytes(view.data(), static_cast<qsizetype>(view.size()));
-    const QByteArrayView richText = richTextIn(bytes);
-    const bool isRich = !richText.isEmpty();
-    SavedReport saved;
-    std::optional<InputError> error = isRich ? readRichText(input, richText, saved) : readText(input, bytes, saved);
-    if (const auto lost = std::get<std::shared_ptr<const FileBytes>>(file)->lostBytes()) {
-        error = lost;
-    }
-    if (error) {
-        printError(error->message());
-        return exitInput;
-    }
-    // The pages of a PDF are those that the report was written in; no other kind has pages.
-    if (!job.page.linesPerPage) {
-        job.page.linesPerPage =
-            job.outputs.front().kind == OutputKind::Pdf ? linesOfPages(saved.text) : PageGeometry().linesPerPage;
-    }
-    job.page.charsPerRow = job.page.charsPerRow.value_or(PageGeometry().charsPerRow);
-    const auto application = startQt(argc, argv, JobRunner::needsFonts(job) || needsFonts(job.outputs));
+    SavedText &saved = std::get<SavedText>(file);
+    fixPage(job, saved);
+    const auto application = startQt(argc, argv, !job.page.isFixed() || needsFonts(job.outputs));
     TerminalProgress bar(progress);
-    JobRunner runner(job, source, bar);
-    error = runner.run();
-    if (error) {
+    UReportDoc report(surroundingsOf(job));
+    if (const auto error = JobRunner(job, source, bar).run(report)) {
         return usageExit(Xlate("--set: %1").arg(error->text)); // no input is left that could be wrong
     }
-    UReportDoc &report = runner.report();
-    if (report.GetRTFDataFlag()) {
-        writeLines(report, saved.text);
-    } else {
-        report.Write(saved.text, 0);
-    }
-    if (report.HasLostText()) {
-        throw std::bad_alloc();
-    }
-    report.FindPageStarts();
-    // The report holds it all now.
-    file = InputError();
-    saved.text = QString();
+    writeSaved(report, saved.text);
+    saved.text = QString(); // the report holds it all now
     for (const QString &warning : quiet ? QStringList() : saved.warnings) {
         printError(Xlate("kareport: warning: \"%1\": %2").arg(input, warning));
     }

@@ -2,8 +2,7 @@
 
 #include "FileIdentity.h"
 #include "Interrupt.h"
-#include "OutputClash.h"
-#include "UpToDate.h"
+#include "JobFiles.h"
 #include "Xlate.h"
 
 #include <algorithm>
@@ -51,7 +50,7 @@ ExitStatus RenderBatch::run(const QStringList &jobs)
 
 ExitStatus RenderBatch::make(const QString &path)
 {
-    RenderJob job(command_, JsonSource::read(path));
+    CommandLineJob job(command_, JsonSource::read(path));
     if (job.status() != exitDone || takesFileOfAnother(job, path)) {
         return job.status();
     }
@@ -69,7 +68,7 @@ ExitStatus RenderBatch::make(const QString &path)
 }
 
 /// Whether a file that a job writes was written by an earlier one, or is needed by another: one of the two would be lost.
-bool RenderBatch::takesFileOfAnother(RenderJob &job, const QString &path)
+bool RenderBatch::takesFileOfAnother(CommandLineJob &job, const QString &path)
 {
     for (const Output &output : job.job().outputs) {
         const QString identity = outputIdentity(output);

@@ -1,7 +1,7 @@
 #pragma once
 
+#include "CommandLineJob.h"
 #include "Commands.h"
-#include "RenderJob.h"
 #include "TerminalProgress.h"
 
 #include <QHash>
@@ -9,7 +9,7 @@
 namespace kareport
 {
 
-/// Makes the reports of many jobs, one behind the other. A job that fails does not keep the others from being made.
+/// Makes the reports of many jobs, one after the other. A job that fails does not keep the others from being made.
 class RenderBatch
 {
 public:
@@ -23,7 +23,7 @@ public:
 
 private:
     ExitStatus make(const QString &path);
-    bool takesFileOfAnother(RenderJob &job, const QString &path);
+    bool takesFileOfAnother(CommandLineJob &job, const QString &path);
     void noteFiles(const Job &job, const QString &path);
     void sayWhatWasDone(qsizetype jobs) const;
 

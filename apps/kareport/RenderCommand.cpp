@@ -1,12 +1,12 @@
 #include "Commands.h"
 
+#include "CommandLineJob.h"
 #include "CommandSetup.h"
+#include "JobFiles.h"
 #include "JobList.h"
 #include "RenderBatch.h"
-#include "RenderJob.h"
 #include "SizeLimit.h"
 #include "TerminalProgress.h"
-#include "UpToDate.h"
 #include "Xlate.h"
 
 namespace kareport
@@ -86,8 +86,8 @@ ExitStatus RenderCommand::run(int &argc, char **argv) const
         batch.keep(all, jobList);
         return batch.run(slice ? JobSlice::fromText(*slice)->of(all) : all);
     }
-    RenderJob job(*this, isShort() ? Expected<JsonSource>(JsonSource::fromObject(templateJob.toJson()))
-                                   : JsonSource::read(jobs.first()));
+    CommandLineJob job(*this, isShort() ? Expected<JsonSource>(JsonSource::fromObject(templateJob.toJson()))
+                                        : JsonSource::read(jobs.first()));
     if (job.status() != exitDone) {
         return job.status();
     }

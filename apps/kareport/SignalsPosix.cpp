@@ -20,8 +20,8 @@ namespace
 constexpr long patience = 200'000'000; ///< nanoseconds that work has for coming to a safe point
 
 std::atomic<int> interruptingSignal{0};
-std::atomic<bool> hasTimer{false};
-timer_t timer;
+std::atomic<bool> hasPatienceTimer{false};
+timer_t patienceTimer;
 
 // What a handler uses must be free of locks.
 static_assert(std::atomic<bool>::is_always_lock_free && std::atomic<int>::is_always_lock_free);
@@ -52,12 +52,12 @@ void endAtOnce(int signal)
 extern "C" void noteInterrupt(int signal)
 {
     int none = 0;
-    if (!interruptingSignal.compare_exchange_strong(none, signal) || !hasTimer) {
+    if (!interruptingSignal.compare_exchange_strong(none, signal) || !hasPatienceTimer) {
         endAtOnce(signal);
     }
     setInterrupted(true);
     const itimerspec once = {{0, 0}, {0, patience}};
-    timer_settime(timer, 0, &once, nullptr);
+    timer_settime(patienceTimer, 0, &once, nullptr);
 }
 
 extern "C" void endImpatiently(int /*signal*/)
@@ -92,7 +92,7 @@ void catchInterrupts()
     event.sigev_notify = SIGEV_SIGNAL;
     event.sigev_signo = SIGALRM;
     std::signal(SIGALRM, endImpatiently);
-    hasTimer = hasTimer || timer_create(CLOCK_MONOTONIC, &event, &timer) == 0;
+    hasPatienceTimer = hasPatienceTimer || timer_create(CLOCK_MONOTONIC, &event, &patienceTimer) == 0;
     for (const int signal : {SIGINT, SIGTERM, SIGHUP}) {
         handle(signal, noteInterrupt);
     }

@@ -1,6 +1,6 @@
 #include "TerminalProgress.h"
 
-#include "VisibleText.h"
+#include "Printing.h"
 
 #include <algorithm>
 #include <atomic>

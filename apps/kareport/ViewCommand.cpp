@@ -1,6 +1,6 @@
 #include "Commands.h"
 
-#include "PdfFile.h"
+#include "SavedText.h"
 #include "Xlate.h"
 
 #include <QCoreApplication>

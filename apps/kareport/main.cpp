@@ -264,7 +264,7 @@ int main(int argc, char **argv)
     if (status == kareport::exitInterrupted) {
         kareport::endByInterrupt();
     }
-    // A full disk behind standard output shows when the last of it is written.
+    // A full disk under standard output shows when the last of it is written.
     if (std::fflush(stdout) != 0 || std::ferror(stdout) != 0) {
         if (!kareport::isOutputReaderGone()) {
             kareport::printError(QStringLiteral("kareport: standard output could not be written"));

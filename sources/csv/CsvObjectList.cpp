@@ -169,7 +169,7 @@ void CsvObjectList::fill(RowBatch &batch)
     batch.position = reader_.position();
 }
 
-/// Goes to the next row of a sorted list. @return false behind the last one
+/// Goes to the next row of a sorted list. @return false after the last one
 bool CsvObjectList::seekNext()
 {
     if (order_) {

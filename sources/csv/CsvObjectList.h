@@ -3,22 +3,17 @@
 #include "CsvReader.h"
 #include "DataUnits.h"
 #include "RowBatches.h"
-#include "UDataObjectList.h"
+#include "RowList.h"
 #include "ValueParser.h"
 
-#include <functional>
 #include <memory>
 #include <optional>
 
 namespace kareport
 {
 
-/// Is told now and then how many bytes have been read. @return false to stop
-using ReadProgress = std::function<bool(std::size_t bytes)>;
-
-/// The rows of a CSV file as data objects, made while they are asked for in turn: the file is read once and only a few
-/// objects exist at a time. When something is wrong with a row, the list ends there and `error` says what.
-class CsvObjectList : public UDataObjectList
+/// The rows of a CSV file: the file is read once and only a few objects exist at a time. Progress is told in bytes.
+class CsvObjectList : public RowList
 {
 public:
     /// Reads the header row. Columns that the dictionary does not know are passed over.
@@ -30,7 +25,7 @@ public:
     /// Reads the sort keys of all rows and orders the places of the rows; they are then read in that order.
     void Sort(const std::vector<unsigned> &ids) override;
 
-    const std::optional<InputError> &error() const { return error_; }
+    std::optional<InputError> error() const override { return error_; }
 
 private:
     struct Column

@@ -133,7 +133,7 @@ bool CsvReader::scanRow()
     return endRow(at);
 }
 
-/// Reads a quoted cell from its opening quote to behind its closing one.
+/// Reads a quoted cell from its opening quote to after its closing one.
 bool CsvReader::scanQuoted(std::size_t limit)
 {
     const std::size_t opening = position_;

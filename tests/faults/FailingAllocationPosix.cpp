@@ -1,4 +1,4 @@
-#include "FailingAllocationPosix.h"
+#include "FailingAllocation.h"
 
 #include <cerrno>
 #include <cstddef>

@@ -1,4 +1,4 @@
-#include "FailingFilesPosix.h"
+#include "FailingFiles.h"
 
 #include <cerrno>
 #include <cstddef>

@@ -1,9 +1,9 @@
-#include "FailingFilesPosix.h"
+#include "FailingFiles.h"
 
+#include "CommandLineJob.h"
 #include "FrameFixture.h"
+#include "JobOutputs.h"
 #include "JobRunnerFixture.h"
-#include "OutputWriter.h"
-#include "RenderJob.h"
 #include "ViewFixture.h"
 
 #include <QDir>
@@ -128,16 +128,18 @@ TEST(ReportSaves, AnOutputOfTheCommandLineIsWholeOrNotWritten)
     for (const Row &row : rows) {
         SCOPED_TRACE(row.name);
         const QString path = folder.filePath(QString::fromUtf8(row.name));
-        std::optional<QString> error;
+        kareport::OutputResult result;
         failEachCall(
             path, [] {},
             [&] {
                 kareport::Progress progress(false);
-                QStringList warnings;
-                error = kareport::writeOutput(shown.report, {path, row.kind}, progress, warnings);
-                return !error;
+                result = kareport::writeOutput(shown.report, {path, row.kind}, progress);
+                return result.isWritten();
             },
-            [&] { EXPECT_TRUE(error->contains(QStringLiteral("could not be written"))) << error->toStdString(); });
+            [&] {
+                EXPECT_TRUE(result.problem->contains(QStringLiteral("could not be written")))
+                    << result.problem->toStdString();
+            });
     }
 }
 
@@ -161,7 +163,7 @@ TEST(ReportSaves, AJobThatGoesStraightToItsFileIsWholeOrNotWritten)
         failEachCall(
             path, [] {},
             [&] {
-                kareport::RenderJob job(command, kareport::JsonSource::read(folder.path("job.json")));
+                kareport::CommandLineJob job(command, kareport::JsonSource::read(folder.path("job.json")));
                 kareport::Progress progress(false);
                 return job.run(progress) == kareport::exitDone;
             },

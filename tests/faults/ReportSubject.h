@@ -2,7 +2,7 @@
 
 #include "DataReport.h"
 #include "EditorFixture.h"
-#include "FailingAllocationPosix.h"
+#include "FailingAllocation.h"
 #include "ReportWindowFixture.h"
 #include "TemporaryFolder.h"
 #include "UDataObjectList.h"

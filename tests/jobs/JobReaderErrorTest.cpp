@@ -23,18 +23,17 @@ void expectErrors(const Row (&rows)[count])
 {
     for (const Row &row : rows) {
         const MarkedText marked(row.job);
-        auto read = JsonSource::fromBytes(QStringLiteral("job.json"), marked.text);
+        const auto read = JsonSource::fromBytes(QStringLiteral("job.json"), marked.text);
         ASSERT_EQ(errorOf(read), nullptr) << row.job;
-        auto &source = std::get<JsonSource>(read);
-        kareport::readJob(source);
-        ASSERT_TRUE(source.failed()) << row.reason << ": " << row.job;
-        const QString message = source.error()->message();
+        const auto job = kareport::readJob(std::get<JsonSource>(read));
+        const kareport::InputError *error = errorOf(job);
+        ASSERT_NE(error, nullptr) << row.reason << ": " << row.job;
+        const QString message = error->message();
         EXPECT_TRUE(message.startsWith(QStringLiteral("job.json:%1: error: ").arg(marked.place)))
             << row.reason << ": " << row.job << "\n"
             << message.toStdString();
-        EXPECT_TRUE(source.error()->text.contains(QString::fromUtf8(row.contains)))
-            << row.reason << ": " << row.job << "\n"
-            << message.toStdString();
+        EXPECT_TRUE(error->text.contains(QString::fromUtf8(row.contains))) << row.reason << ": " << row.job << "\n"
+                                                                           << message.toStdString();
         EXPECT_FALSE(message.contains(u'\n')) << row.reason;
     }
 }

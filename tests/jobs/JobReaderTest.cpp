@@ -20,7 +20,6 @@ using jobtext::jobOf;
 TEST(JobReader, EveryKeyButReportIsOptional)
 {
     const Job job = jobOf(R"({"report": []})");
-    EXPECT_EQ(job.folder, folder);
     EXPECT_FALSE(job.title);
     EXPECT_EQ(job.application, QStringLiteral("TALVEN"));
     EXPECT_TRUE(job.header);
@@ -88,6 +87,35 @@ TEST(JobReader, ASeparatorIsACodeOrATextOfOneCharacter)
     for (const Row &row : rows) {
         const QByteArray json = QByteArray(R"({"report": [], "options": {"separator": )") + row.separator + "}}";
         EXPECT_EQ(jobOf(json).options.separator, row.expected) << row.separator;
+    }
+}
+
+TEST(JobReader, TheJobsOwnTemplateFileComesBeforeAnInstalledOne)
+{
+    const JobFolder own;
+    const JobFolder installed;
+    own.put("both.xml", "");
+    installed.put("both.xml", "");
+    installed.put("installed.xml", "");
+    struct Row
+    {
+        const char *name;
+        QString expected;
+        const char *reason;
+    };
+    const Row rows[] = {
+        {"both.xml", own.path("both.xml"), "both folders have it"},
+        {"installed.xml", installed.path("installed.xml"), "the job's folder does not have it"},
+        {"none.xml", own.path("none.xml"), "neither has it: it is missed beside the job"},
+    };
+    for (const Row &row : rows) {
+        const QByteArray json = QByteArray(R"({"report": [], "template": {"name": "T", "file": ")") + row.name + "\"}}";
+        const auto source = kareport::JsonSource::fromBytes(own.path("job.json"), json);
+        const auto job =
+            kareport::readJob(std::get<kareport::JsonSource>(source), {.templateFolder = installed.path()});
+        ASSERT_EQ(kareport::errorOf(job), nullptr) << row.reason;
+        EXPECT_EQ(std::get<Job>(job).reportTemplate->file, row.expected) << row.reason;
+        EXPECT_EQ(std::get<Job>(job).reportTemplate->name, QStringLiteral("T")) << row.reason;
     }
 }
 

@@ -1,5 +1,7 @@
 #include "JobRunnerFixture.h"
+#include "JobText.h"
 #include "PageHeader.h"
+#include "Preferences.h"
 
 #include <QtGlobal>
 
@@ -162,6 +164,81 @@ TEST(JobRunner, ThePreferencesOfWhoRunsAJobDoNotMatter)
     EXPECT_EQ(job.text(), QStringLiteral("Pt|123456\n"));
 }
 
+/// Profile entries that are only read.
+class UntouchedProfile : public kareport::ProfileStore
+{
+public:
+    QString read(const QString & /*section*/, const QString & /*entry*/, const QString &fallback) const override
+    {
+        return fallback;
+    }
+    void write(const QString & /*section*/, const QString &entry, const QString & /*value*/) override
+    {
+        ADD_FAILURE() << entry.toStdString() << " is written";
+    }
+};
+
+TEST(JobRunner, TheProgramAroundAJobStaysAsItIs)
+{
+    const FixedSurroundings surroundings;
+    kareport::setProfileStore(std::make_unique<UntouchedProfile>());
+    const QString start = GetStartPathName();
+    const auto source = jobtext::sourceOf(R"({"application": "TALVEN Job", "now": "1999-12-31T23:59:00",
+        "page": {"paper": "A3", "resolution": 300, "orientation": "landscape", "margins": [1, 2, 3, 4], "fontSize": 13},
+        "options": {"printHash": true}, "report": [{"line": "a"}, {"line": "b"}]})");
+    const auto job = kareport::readJob(source);
+    ASSERT_EQ(kareport::errorOf(job), nullptr);
+    UReportDoc report(kareport::surroundingsOf(std::get<kareport::Job>(job)));
+    kareport::Progress progress(false);
+    kareport::JobRunner runner(std::get<kareport::Job>(job), source, progress);
+    int asked = 0;
+    runner.stopWhen([&] {
+        ++asked;
+        EXPECT_EQ(kareport::defaultPrinter().paper, kareport::PaperSize::A4);
+        EXPECT_EQ(kareport::currentTime().date().year(), 2024);
+        EXPECT_EQ(GetApplicationTitle(), QStringLiteral("TALVEN"));
+        EXPECT_EQ(GetStartPathName(), start);
+        EXPECT_TRUE(IsReportPrinterSetToPortrait());
+        return false;
+    });
+    EXPECT_FALSE(runner.run(report));
+    EXPECT_GE(asked, 2) << "after each step";
+    EXPECT_TRUE(textOf(report).startsWith(QStringLiteral("TALVEN Job - "))) << textOf(report).toStdString();
+    EXPECT_TRUE(textOf(report).contains(QStringLiteral("Dec 31, 1999  11:59PM")));
+    EXPECT_EQ(report.GetPageSize(), QSize(4961, 3508));
+    EXPECT_EQ(report.GetMargins(), QMargins(1, 2, 3, 4));
+    EXPECT_EQ(report.GetFontSize(), 13U);
+    kareport::setProfileStore(kareport::makeMemoryProfile());
+
+    report.SetHeader();
+    report.Clear();
+    report.NewPage(-1);
+    EXPECT_TRUE(textOf(report).startsWith(QStringLiteral("TALVEN - "))) << "what comes later is the program's again";
+}
+
+TEST(JobRunner, AReportOfAProgramWithPreferencesIsMadeAsTheJobSays)
+{
+    TestJob job;
+    const char *const json = R"({"now": "2024-03-05T14:07:00", "page": {"paper": "A4"}, "report": [{"line": "a"}]})";
+    job.runWhole(json);
+    const QString expected = job.text();
+    const int lines = job.report().GetLinesPerPage();
+    WriteProfileString(QString(), QStringLiteral("Report Margins"), QStringLiteral("5000, 5000, 5000, 5000"));
+    SetReportFontSize(20);
+    SetReportPrinterSetToPortrait(false);
+    const auto source = jobtext::sourceOf(json);
+    const auto read = kareport::readJob(source);
+    ReportApplication application;
+    UReportDoc &report = *application.create(QString());
+    ASSERT_NE(report.GetLinesPerPage(), lines);
+    kareport::Progress progress(false);
+    EXPECT_FALSE(kareport::JobRunner(std::get<kareport::Job>(read), source, progress).run(report));
+    EXPECT_EQ(textOf(report), reportLines(expected));
+    EXPECT_EQ(report.GetLinesPerPage(), lines);
+    EXPECT_EQ(report.GetMargins(), QMargins(1000, 1000, 1200, 2000));
+    EXPECT_EQ(report.GetFontSize(), 8U);
+}
+
 TEST(JobRunner, TheChainageLabelStandsInTheHeading)
 {
     TestJob job;
@@ -239,13 +316,11 @@ TEST(JobRunner, TheDateIsTheJobsOrTheBuilds)
             << row.reason << ": " << job.text().toStdString();
     }
     qunsetenv("SOURCE_DATE_EPOCH");
-    const QDateTime start = QDateTime::currentDateTime().addSecs(-60);
     TestJob job;
+    kareport::fixTime(QDateTime(QDate(2031, 2, 3), QTime(4, 5)));
     job.runWhole(R"({"page": {"linesPerPage": 72, "charsPerRow": 80}, "report": [{"line": "a"}]})");
-    const bool fromClock = job.text().contains(kareport::pageHeaderDate(start)) ||
-                           job.text().contains(kareport::pageHeaderDate(start.addSecs(60))) ||
-                           job.text().contains(kareport::pageHeaderDate(start.addSecs(120)));
-    EXPECT_TRUE(fromClock) << "without either the clock is read";
+    EXPECT_TRUE(job.text().contains(QStringLiteral("Feb 03, 2031  04:05AM")))
+        << "without either the host's clock is read";
     if (!before.isNull()) {
         qputenv("SOURCE_DATE_EPOCH", before);
     }

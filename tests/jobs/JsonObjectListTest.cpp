@@ -31,8 +31,7 @@ public:
         const auto findVariable = [&](const QString &name) -> std::optional<ValueParser> {
             return name == u"V" ? std::optional(ValueParser(type, id, units)) : std::nullopt;
         };
-        kareport::storeJsonObject(JsonNode(source), findVariable, object);
-        error = source.error();
+        kareport::storeJsonObject(JsonNode(source, error), findVariable, object);
     }
 
     /// The value with its kind; "none" when there is none.
@@ -162,12 +161,73 @@ TEST(JsonObjectList, AnElementThatIsNoObjectIsAnError)
     auto &source = std::get<JsonSource>(read);
     UDataObject object;
     const auto nothing = [](const QString &) -> std::optional<ValueParser> { return std::nullopt; };
-    const JsonNode values = JsonNode(source)[QStringLiteral("values")];
+    std::optional<kareport::InputError> error;
+    const JsonNode values = JsonNode(source, error)[QStringLiteral("values")];
     kareport::storeJsonObject(values[0], nothing, object);
-    EXPECT_FALSE(source.failed());
+    EXPECT_FALSE(error);
     kareport::storeJsonObject(values[1], nothing, object);
-    EXPECT_EQ(placeText(source.error()), QStringLiteral("2:2"));
-    EXPECT_EQ(textOfError(source.error()), QStringLiteral("an object was expected"));
+    EXPECT_EQ(placeText(error), QStringLiteral("2:2"));
+    EXPECT_EQ(textOfError(error), QStringLiteral("an object was expected"));
+}
+
+/// The list of the values of a data set "d", whose variable "V" is a number with the identifier `id`.
+kareport::JsonObjectList listOf(const JsonSource &source, bool firstOnly, const kareport::ReadProgress &progress = {})
+{
+    const auto findVariable = [](const QString &name) -> std::optional<ValueParser> {
+        return name == u"V" ? std::optional(ValueParser(VARIABLE_DOUBLE, id, DataUnits())) : std::nullopt;
+    };
+    const kareport::JsonPath path = {QStringLiteral("data"), QStringLiteral("d"), QStringLiteral("values")};
+    return {source, path, findVariable, firstOnly, progress};
+}
+
+TEST(JsonObjectList, HasTheObjectsAsRowsUntilOneIsWrong)
+{
+    struct Row
+    {
+        const char *values;
+        bool firstOnly;
+        std::size_t rows;
+        const char *place; ///< of the error; null for none
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {R"([{"V": 1}, {"V": 2}])", false, 2, nullptr, "a list of objects"},
+        {R"({"V": 1})", false, 1, nullptr, "an object is a row"},
+        {"[]", false, 0, nullptr, "no row"},
+        {R"([{"V": 1}, {"V": 2}])", true, 1, nullptr, "one row is enough"},
+        {R"([{"V": 1}, {"V": "x"}])", true, 1, nullptr, "what is not looked at is not wrong"},
+        {"[{\"V\": 1},\n{\"V\": \"x\"},\n{\"V\": \"y\"}]", false, 2, "2:7", "the first error counts"},
+    };
+    for (const Row &row : rows) {
+        const QByteArray json = QByteArray(R"({"data": {"d": {"values":)") + "\n" + row.values + "}}}";
+        const auto read = JsonSource::fromBytes(QStringLiteral("job.json"), json);
+        ASSERT_EQ(errorOf(read), nullptr) << row.reason;
+        kareport::JsonObjectList list = listOf(std::get<JsonSource>(read), row.firstOnly);
+        std::size_t count = 0;
+        while (list.GetAt(count) != nullptr) {
+            ++count;
+        }
+        EXPECT_EQ(count, row.rows) << row.reason;
+        EXPECT_EQ(list.error().has_value(), row.place != nullptr) << row.reason;
+    }
+}
+
+TEST(JsonObjectList, EndsWhenTheWorkIsStopped)
+{
+    QByteArray json = R"({"data": {"d": {"values": [{"V": 1})";
+    for (int i = 1; i < 1000; ++i) {
+        json += R"(,{"V": 1})";
+    }
+    const auto read = JsonSource::fromBytes(QStringLiteral("job.json"), json + "]}}}");
+    ASSERT_EQ(errorOf(read), nullptr);
+    kareport::JsonObjectList list =
+        listOf(std::get<JsonSource>(read), false, [](std::size_t done) { return done < 512; });
+    std::size_t count = 0;
+    while (list.GetAt(count) != nullptr) {
+        ++count;
+    }
+    EXPECT_EQ(count, 512U);
+    EXPECT_FALSE(list.error()) << "stopping is no error";
 }
 
 } // namespace

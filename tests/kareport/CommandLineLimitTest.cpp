@@ -52,6 +52,12 @@ QByteArray job(const char *steps, const char *front = R"("header": false, )")
     return QByteArray("{") + front + R"("page": {"linesPerPage": 10, "charsPerRow": 80}, "report": [)" + steps + "]}";
 }
 
+qint64 leastSizeOf(const QString &job)
+{
+    const auto source = kareport::JsonSource::read(job);
+    return kareport::leastSize(std::get<kareport::Job>(kareport::readJob(std::get<kareport::JsonSource>(source))));
+}
+
 TEST(CommandLineLimit, TheLeastSizeIsTheSizeOfAReportWithoutData)
 {
     struct Row
@@ -78,14 +84,11 @@ TEST(CommandLineLimit, TheLeastSizeIsTheSizeOfAReportWithoutData)
         folder.put("job.json", job(row.steps));
         const ProgramRun run = folder.run("render job.json");
         EXPECT_EQ(run.status, 0) << row.reason << run.all().constData();
-        auto source = kareport::JsonSource::read(folder.path("job.json"));
-        const kareport::Job read = kareport::readJob(std::get<kareport::JsonSource>(source));
-        EXPECT_EQ(kareport::leastSize(read), run.out.size()) << row.reason;
+        EXPECT_EQ(leastSizeOf(folder.path("job.json")), run.out.size()) << row.reason;
         // With headers only their names are not known exactly.
         folder.put("job.json", job(row.steps, ""));
         const ProgramRun headed = folder.run("render job.json");
-        source = kareport::JsonSource::read(folder.path("job.json"));
-        const qint64 least = kareport::leastSize(kareport::readJob(std::get<kareport::JsonSource>(source)));
+        const qint64 least = leastSizeOf(folder.path("job.json"));
         EXPECT_LE(least, headed.out.size()) << row.reason;
         EXPECT_GE(least, headed.out.size() - 100 * headed.out.count("Page:")) << row.reason;
     }
@@ -104,8 +107,7 @@ TEST(CommandLineLimit, TheLeastSizeIsNeverTooLargeWithData)
             "data": {"p": {"csv": "points.csv"}}, )"));
         const ProgramRun run = folder.run("render job.json");
         EXPECT_EQ(run.status, 0) << run.all().constData();
-        auto source = kareport::JsonSource::read(folder.path("job.json"));
-        const qint64 least = kareport::leastSize(kareport::readJob(std::get<kareport::JsonSource>(source)));
+        const qint64 least = leastSizeOf(folder.path("job.json"));
         EXPECT_LE(least, run.out.size()) << step;
         EXPECT_GT(least, 0) << step;
     }

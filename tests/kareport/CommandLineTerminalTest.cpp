@@ -1,6 +1,6 @@
 #include "CommandLine.h"
 
-#include "VisibleText.h"
+#include "Printing.h"
 
 #include <gtest/gtest.h>
 

@@ -4,10 +4,10 @@
 #include "DeskApplication.h"
 #include "DeskFrame.h"
 #include "Folders.h"
+#include "Job.h"
 #include "JobFolder.h"
 #include "Profile.h"
 #include "ReportEntry.h"
-#include "TemplateJob.h"
 #include "UReportDoc.h"
 
 #include <QCoreApplication>

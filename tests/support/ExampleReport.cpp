@@ -2,15 +2,15 @@
 
 ExampleReport::ExampleReport(const char *job)
 {
-    auto read = kareport::JsonSource::read(QStringLiteral(KAREPORT_EXAMPLES_DIR "/") + QString::fromLatin1(job));
-    source_ = std::make_unique<kareport::JsonSource>(std::get<kareport::JsonSource>(std::move(read)));
-    job_ = kareport::readJob(*source_);
-    EXPECT_FALSE(source_->failed());
-    runner_ = std::make_unique<kareport::JobRunner>(job_, *source_, progress_);
-    EXPECT_FALSE(runner_->run());
-    report().SetAutoDelete(false);
+    const auto source =
+        kareport::JsonSource::read(QStringLiteral(KAREPORT_EXAMPLES_DIR "/") + QString::fromLatin1(job));
+    const auto read = kareport::readJob(std::get<kareport::JsonSource>(source));
+    kareport::Progress progress(false);
+    kareport::JobRunner runner(std::get<kareport::Job>(read), std::get<kareport::JsonSource>(source), progress);
+    EXPECT_FALSE(runner.run(report_));
+    report_.SetAutoDelete(false);
     pane_ = new CViewPane;
-    view_ = showIn<UReportView>(*pane_, report());
+    view_ = showIn<UReportView>(*pane_, report_);
     view_->OnInitialUpdate();
     view_->UpdateData(true);
 }

@@ -6,8 +6,6 @@
 
 #include <gtest/gtest.h>
 
-#include <memory>
-
 /// The report of a job among the examples, with a view of it.
 class ExampleReport
 {
@@ -17,15 +15,12 @@ public:
     ExampleReport(const ExampleReport &) = delete;
     ExampleReport &operator=(const ExampleReport &) = delete;
 
-    UReportDoc &report() { return runner_->report(); }
+    UReportDoc &report() { return report_; }
     UReportView &view() { return *view_; }
 
 private:
     FixedSurroundings surroundings_;
-    kareport::Progress progress_{false};
-    kareport::Job job_;
-    std::unique_ptr<kareport::JsonSource> source_;
-    std::unique_ptr<kareport::JobRunner> runner_;
+    UReportDoc report_;
     CViewPane *pane_ = nullptr;
     UReportView *view_ = nullptr;
 };

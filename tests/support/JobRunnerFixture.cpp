@@ -26,22 +26,23 @@ QByteArray pointsTemplate(const char *title)
 
 void TestJob::runWhole(const QByteArray &json)
 {
-    runner_.reset();
+    report_.reset();
     error.reset();
     folder.put("job.json", json);
-    auto read = kareport::JsonSource::read(folder.path("job.json"));
+    const auto source = kareport::JsonSource::read(folder.path("job.json"));
+    if (const auto *wrong = kareport::errorOf(source)) {
+        error = *wrong;
+        return;
+    }
+    const auto read = kareport::readJob(std::get<kareport::JsonSource>(source));
     if (const auto *wrong = kareport::errorOf(read)) {
         error = *wrong;
         return;
     }
-    source_ = std::make_unique<kareport::JsonSource>(std::get<kareport::JsonSource>(std::move(read)));
-    job_ = kareport::readJob(*source_);
-    error = source_->error();
-    if (error) {
-        return;
-    }
-    runner_ = std::make_unique<kareport::JobRunner>(job_, *source_, progress_);
-    error = runner_->run();
+    const auto &job = std::get<kareport::Job>(read);
+    report_ = std::make_unique<UReportDoc>(kareport::surroundingsOf(job));
+    kareport::Progress progress(false);
+    error = kareport::JobRunner(job, std::get<kareport::JsonSource>(source), progress).run(*report_);
 }
 
 QString TestJob::text()

@@ -31,7 +31,7 @@ public:
     void run(const QByteArray &content) { runWhole(fixedFront + content + '}'); }
     void runWhole(const QByteArray &json);
 
-    UReportDoc &report() { return runner_->report(); }
+    UReportDoc &report() { return *report_; }
     /// The report's text with LF for its line ends; the message when there is none.
     QString text();
 
@@ -43,10 +43,7 @@ public:
     std::optional<kareport::InputError> error;
 
 private:
-    kareport::Progress progress_{false};
-    kareport::Job job_;
-    std::unique_ptr<kareport::JsonSource> source_;
-    std::unique_ptr<kareport::JobRunner> runner_;
+    std::unique_ptr<UReportDoc> report_;
 };
 
 /// A template step's front for jobs: no header, the template, the data sets and the steps.

@@ -12,10 +12,12 @@ kareport::JsonSource sourceOf(const QByteArray &json)
 
 kareport::Job jobOf(const QByteArray &json)
 {
-    kareport::JsonSource source = sourceOf(json);
-    kareport::Job job = readJob(source);
-    EXPECT_FALSE(source.failed()) << source.error()->message().toStdString();
-    return job;
+    auto job = readJob(sourceOf(json));
+    if (const auto *error = kareport::errorOf(job)) {
+        ADD_FAILURE() << error->message().toStdString();
+        return {};
+    }
+    return std::get<kareport::Job>(std::move(job));
 }
 
 } // namespace jobtext

@@ -14,7 +14,7 @@ namespace
 
 using jobtext::jobOf;
 
-TEST(JobSettingsReader, SettingsHaveTheHostsDefaults)
+TEST(JobSettings, SettingsHaveTheHostsDefaults)
 {
     for (const char *json : {R"({"report": []})", R"({"report": [], "settings": {}})"}) {
         const UJobSettings settings = jobOf(json).settings;
@@ -35,7 +35,7 @@ TEST(JobSettingsReader, SettingsHaveTheHostsDefaults)
     }
 }
 
-TEST(JobSettingsReader, ReadsEverySettingByItsKey)
+TEST(JobSettings, ReadsEverySettingByItsKey)
 {
     struct Row
     {
@@ -95,7 +95,7 @@ TEST(JobSettingsReader, ReadsEverySettingByItsKey)
     }
 }
 
-TEST(JobSettingsReader, ReadsEveryUnitOfADataSet)
+TEST(JobSettings, ReadsEveryUnitOfADataSet)
 {
     using U = const kareport::DataUnits &;
     struct Row

@@ -1,7 +1,9 @@
-#include "JobReader.h"
+#include "JobSettings.h"
 
-#include "JobSettingsWords.h"
+#include "OrientationOrder.h"
 #include "Xlate.h"
+
+#include <QJsonArray>
 
 #include <array>
 
@@ -10,6 +12,19 @@ namespace kareport
 
 namespace
 {
+
+// The words of settings, in the order of the values that they mean.
+constexpr std::array<QStringView, 3> stationFormats = {u"plain", u"0+00", u"0+000"};
+constexpr std::array<QStringView, 2> northEastOrders = {u"EN", u"NE"};
+constexpr std::array<QStringView, 3> bearingUnits = {u"dms", u"deg", u"gon"};
+constexpr std::array<QStringView, 2> bearingStyles = {u"circle", u"quadrant"};
+constexpr std::array<QStringView, 2> bearingReferences = {u"north", u"south"};
+
+static_assert(static_cast<std::size_t>(UJobSettings::StationFormat::ThousandsPlus) + 1 == stationFormats.size() &&
+                  static_cast<int>(UJobSettings::StationFormat::Plain) == 0 &&
+                  static_cast<int>(UJobSettings::StationFormat::HundredsPlus) == 1,
+              "a word for each station format, in their order");
+static_assert(ORDER_EASTING_NORTHING == 0 && ORDER_NORTHING_EASTING == 1);
 
 constexpr int mostDecimals = 15;
 constexpr int mostBearingDecimals = 9;
@@ -64,6 +79,13 @@ void readAngleMarks(const JsonNode &node, std::array<char, 3> &marks)
     }
 }
 
+/// The word of a value.
+template <typename Words, typename Value>
+QString wordOf(const Words &words, Value value)
+{
+    return words[static_cast<std::size_t>(value)].toString();
+}
+
 } // namespace
 
 UJobSettings readSettings(const JsonNode &node, UJobSettings settings)
@@ -89,6 +111,28 @@ UJobSettings readSettings(const JsonNode &node, UJobSettings settings)
     choose(node["bearingReference"], placeIn(bearingReferences), "north, south", settings.bearingReference);
     readAngleMarks(node["angleMarks"], settings.angleMarks);
     return settings;
+}
+
+QJsonObject settingsToJson(const UJobSettings &settings)
+{
+    QJsonArray marks;
+    for (const char mark : settings.angleMarks) {
+        marks.append(mark == 0 ? QString() : QString(QLatin1Char(mark)));
+    }
+    return {{QStringLiteral("lengthUnit"), keyOf(settings.lengthUnit).toString()},
+            {QStringLiteral("areaUnit"), keyOf(settings.areaUnit).toString()},
+            {QStringLiteral("angleUnit"), keyOf(settings.angleUnit).toString()},
+            {QStringLiteral("lengthDecimals"), settings.lengthDecimals},
+            {QStringLiteral("stationDecimals"), settings.stationDecimals},
+            {QStringLiteral("numberDecimals"), settings.numberDecimals},
+            {QStringLiteral("stationFormat"), wordOf(stationFormats, settings.stationFormat)},
+            {QStringLiteral("northEastOrder"), wordOf(northEastOrders, settings.northEastOrder)},
+            {QStringLiteral("bearingUnit"), wordOf(bearingUnits, settings.bearingUnit)},
+            {QStringLiteral("bearingStyle"), wordOf(bearingStyles, settings.bearingStyle)},
+            {QStringLiteral("bearingDecimals"), settings.bearingDecimals},
+            {QStringLiteral("bearingPadding"), settings.bearingPadding != 0},
+            {QStringLiteral("bearingReference"), wordOf(bearingReferences, settings.bearingReference)},
+            {QStringLiteral("angleMarks"), marks}};
 }
 
 DataUnits readDataUnits(const JsonNode &node)

@@ -1,8 +1,6 @@
-#include "OutputsWriter.h"
+#include "CommandOutputs.h"
 
 #include "Interrupt.h"
-#include "OutputWriter.h"
-#include "PdfFile.h"
 #include "Signals.h"
 #include "Xlate.h"
 
@@ -22,18 +20,12 @@ ExitStatus stoppedBefore(const Output &output)
 
 } // namespace
 
-bool needsFonts(const std::vector<Output> &outputs)
+ExitStatus sayWritten(const Output &output, const OutputResult &result, bool isEmpty, bool quiet)
 {
-    return std::any_of(outputs.begin(), outputs.end(),
-                       [](const Output &output) { return output.kind == OutputKind::RichText; });
-}
-
-ExitStatus sayWritten(const Output &output, const std::optional<QString> &error, bool isEmpty, bool quiet)
-{
-    if (error) {
-        if (!error->isEmpty()) {
-            printError(QStringLiteral("kareport: ") + *error);
-        }
+    if (result.problem) {
+        printError(QStringLiteral("kareport: ") + *result.problem);
+    }
+    if (!result.isWritten()) {
         return exitOutput;
     }
     if (!quiet && isEmpty && output.kind == OutputKind::Report) {
@@ -59,19 +51,18 @@ ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, 
         if (!output.isStandardOutput()) {
             progress.begin(Xlate("Writing %1").arg(output.file), 0);
         }
-        QStringList warnings;
-        const auto error = writeOutput(report, output, progress, warnings);
-        if (error && error->isEmpty()) {
+        const OutputResult result = writeOutput(report, output, progress);
+        if (result.isReaderGone) {
             endByClosedReader();
         }
         progress.finish();
-        if (error && isInterrupted()) {
+        if (!result.isWritten() && isInterrupted()) {
             return stoppedBefore(output);
         }
-        for (const QString &warning : quiet ? QStringList() : warnings) {
+        for (const QString &warning : quiet ? QStringList() : result.warnings) {
             printError(Xlate("kareport: warning: \"%1\": %2").arg(output.file, warning));
         }
-        status = std::max(status, sayWritten(output, error, report.IsEmpty(), quiet));
+        status = std::max(status, sayWritten(output, result, report.IsEmpty(), quiet));
     }
     return status;
 }

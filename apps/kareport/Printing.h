@@ -9,4 +9,9 @@ namespace kareport
 /// name or a key pretend something, are written as \u001b. Names of files, keys of jobs and texts of templates are not ours.
 QString visibleText(const QString &text);
 
+/// Writes a line to standard output or standard error, as `visibleText`. A tab on standard output stays: it stands between
+/// the columns of a list.
+void printLine(const QString &line);
+void printError(const QString &line);
+
 } // namespace kareport

@@ -1,12 +1,11 @@
-#include "RenderJob.h"
+#include "CommandLineJob.h"
 
+#include "CommandOutputs.h"
 #include "CommandSetup.h"
 #include "Interrupt.h"
+#include "JobFiles.h"
 #include "JobReader.h"
 #include "LeastSize.h"
-#include "OutputClash.h"
-#include "OutputWriter.h"
-#include "OutputsWriter.h"
 #include "ProcessSetup.h"
 #include "ReportTextCodec.h"
 #include "Signals.h"
@@ -28,7 +27,7 @@ constexpr qint64 largeReport = qint64(100) << 20;
 
 } // namespace
 
-RenderJob::RenderJob(const RenderCommand &command, Expected<JsonSource> source)
+CommandLineJob::CommandLineJob(const RenderCommand &command, Expected<JsonSource> source)
     : command_(command), limit_(command.limit ? sizeFromText(*command.limit) : std::nullopt)
 {
     if (const InputError *error = errorOf(source)) {
@@ -41,16 +40,17 @@ RenderJob::RenderJob(const RenderCommand &command, Expected<JsonSource> source)
         return;
     }
     const auto kindOtherwise = outputKindFromName(command.as);
-    job_ = readJob(source_, kindOtherwise);
-    if (source_.error()) {
-        fail(exitInput, source_.error()->message());
+    auto job = readJob(source_, {.outputKind = kindOtherwise});
+    if (const InputError *error = errorOf(job)) {
+        fail(exitInput, error->message());
         return;
     }
+    job_ = std::move(std::get<Job>(job));
     takeOutputs(kindOtherwise);
     checkOutputs();
 }
 
-void RenderJob::takeOutputs(std::optional<OutputKind> kindOtherwise)
+void CommandLineJob::takeOutputs(std::optional<OutputKind> kindOtherwise)
 {
     if (!command_.outputs.isEmpty()) {
         job_.outputs.clear();
@@ -69,23 +69,22 @@ void RenderJob::takeOutputs(std::optional<OutputKind> kindOtherwise)
 }
 
 /// No output may take the place of what the report is made of, or of another output.
-void RenderJob::checkOutputs()
+void CommandLineJob::checkOutputs()
 {
     const auto clash = outputClash(job_, source_.path());
     if (!clash) {
         return;
     }
-    const JsonNode output = JsonNode(source_)["output"];
-    if (command_.outputs.isEmpty() && output.exists()) {
-        output[clash->output].fail(clash->text);
-        fail(exitInput, source_.error()->message());
+    const QString key = QStringLiteral("output");
+    if (command_.outputs.isEmpty() && source_.root().toObject().contains(key)) {
+        fail(exitInput, source_.errorAt({key, clash->output}, clash->text).message());
     } else {
         fail(clash->text);
     }
 }
 
 /// Says how large the report will be at least, where that is much or too much.
-ExitStatus RenderJob::checkSize()
+ExitStatus CommandLineJob::checkSize()
 {
     const qint64 least = leastSize(job_);
     if (limit_ && least > *limit_) {
@@ -97,7 +96,7 @@ ExitStatus RenderJob::checkSize()
     return exitDone;
 }
 
-ExitStatus RenderJob::failTooLarge(qint64 bytes)
+ExitStatus CommandLineJob::failTooLarge(qint64 bytes)
 {
     return fail(exitOutput,
                 Xlate("kareport: nothing was written: the report has at least %1, more than the limit of %2")
@@ -105,51 +104,36 @@ ExitStatus RenderJob::failTooLarge(qint64 bytes)
 }
 
 /// Whether the text exceeds the limit also when every second character is one that plain text does without.
-bool RenderJob::isTooLarge(const UReportDoc *report) const
+bool CommandLineJob::isTooLarge(const UReportDoc &report) const
 {
-    return limit_ && report != nullptr && report->GetTextLength() / 2 > *limit_;
+    return limit_ && report.GetTextLength() / 2 > *limit_;
 }
 
-bool RenderJob::isReaderGone() const
+bool CommandLineJob::isReaderGone() const
 {
     return std::any_of(job_.outputs.begin(), job_.outputs.end(),
                        [](const Output &output) { return output.isStandardOutput(); }) &&
            isOutputReaderGone();
 }
 
-bool RenderJob::needsFonts() const
+bool CommandLineJob::needsFonts() const
 {
-    return JobRunner::needsFonts(job_) || kareport::needsFonts(job_.outputs);
+    return !job_.page.isFixed() || kareport::needsFonts(job_.outputs);
 }
 
-void RenderJob::fail(const QString &text)
+void CommandLineJob::fail(const QString &text)
 {
     fail(exitInput, InputError{source_.path(), std::nullopt, text}.message());
 }
 
-ExitStatus RenderJob::fail(ExitStatus status, const QString &message)
+ExitStatus CommandLineJob::fail(ExitStatus status, const QString &message)
 {
     printError(message);
     status_ = status;
     return status;
 }
 
-/// The output that the text of the report can go to while it is written; null when the whole report must be there first:
-/// for any other kind, for several outputs, for what is no file and so cannot be taken back, and for a report that is
-/// emptied on the way.
-const Output *RenderJob::streamedOutput() const
-{
-    const Output &output = job_.outputs.front();
-    const QFileInfo file(output.file);
-    const bool isText = output.kind == OutputKind::Report || output.kind == OutputKind::Text;
-    const bool isFile = !output.isStandardOutput() && (file.isFile() || !file.exists());
-    const bool isEmptied = std::any_of(job_.steps.begin(), job_.steps.end(), [](const Job::Step &step) {
-        return std::holds_alternative<Job::Clear>(step.action);
-    });
-    return job_.outputs.size() == 1 && isText && isFile && !isEmptied ? &output : nullptr;
-}
-
-ExitStatus RenderJob::madeStatus(JobRunner &runner, const std::optional<InputError> &error)
+ExitStatus CommandLineJob::madeStatus(const UReportDoc &report, const std::optional<InputError> &error)
 {
     if (isInterrupted()) {
         if (!command_.isBatch()) {
@@ -161,32 +145,31 @@ ExitStatus RenderJob::madeStatus(JobRunner &runner, const std::optional<InputErr
         endByClosedReader();
         return exitOutput;
     }
-    if (isTooLarge(runner.madeReport())) {
-        return failTooLarge(runner.report().GetTextLength() / 2);
+    if (isTooLarge(report)) {
+        return failTooLarge(report.GetTextLength() / 2);
     }
     return error ? fail(exitInput, error->message()) : exitDone;
 }
 
 /// Makes the report straight into its output. @return nothing, and nothing made, when the output cannot be opened
-std::optional<ExitStatus> RenderJob::runIntoOutput(JobRunner &runner, const Output &output, Progress &progress)
+std::optional<ExitStatus> CommandLineJob::runIntoOutput(JobRunner &runner, UReportDoc &report, const Output &output,
+                                                        Progress &progress)
 {
     bool isOpen = false;
     bool isMade = false;
     bool isEmpty = false;
     std::optional<InputError> inputError;
     const bool isReport = output.kind == OutputKind::Report; // an empty one makes no file
-    const auto outputError = replaceOutput(output, [&](QIODevice &device) {
+    const auto problem = replaceOutput(output, [&](QIODevice &device, QString & /*problem*/) {
         isOpen = true;
         ReportTextWriter writer(device, isReport ? LineEnds::ReportFile : LineEnds::PlainText);
-        inputError = runner.run(&writer);
+        inputError = runner.run(report, &writer);
         if (inputError || isInterrupted()) {
-            if (UReportDoc *report = runner.madeReport()) {
-                report->StreamText(nullptr);
-            }
+            report.StreamText(nullptr);
             return false;
         }
         isMade = true;
-        const bool isWritten = runner.report().EndTextStream(writer);
+        const bool isWritten = report.EndTextStream(writer);
         isEmpty = isWritten && writer.isEmpty();
         return isWritten && !(isEmpty && isReport);
     });
@@ -195,27 +178,29 @@ std::optional<ExitStatus> RenderJob::runIntoOutput(JobRunner &runner, const Outp
     }
     progress.finish();
     // What comes when the report is made is too late to stop it.
-    return isMade ? sayWritten(output, isEmpty && isReport ? std::nullopt : outputError, isEmpty, command_.quiet)
-                  : madeStatus(runner, inputError);
+    return isMade ? sayWritten(output, {isEmpty && isReport ? std::nullopt : problem}, isEmpty, command_.quiet)
+                  : madeStatus(report, inputError);
 }
 
-ExitStatus RenderJob::run(Progress &progress)
+ExitStatus CommandLineJob::run(Progress &progress)
 {
     if (checkSize() != exitDone) {
         return status_;
     }
+    // It belongs to nobody else: neither the user's preferences nor a printer are asked for it.
+    UReportDoc report(surroundingsOf(job_));
     JobRunner runner(job_, source_, progress);
-    runner.stopWhen([this, &runner] { return isReaderGone() || isTooLarge(runner.madeReport()); });
-    if (const Output *output = streamedOutput()) {
-        if (const auto status = runIntoOutput(runner, *output, progress)) {
+    runner.stopWhen([&] { return isReaderGone() || isTooLarge(report); });
+    if (const Output *output = streamedOutput(job_)) {
+        if (const auto status = runIntoOutput(runner, report, *output, progress)) {
             return status_ = *status;
         }
     }
-    const auto error = runner.run();
+    const auto error = runner.run(report);
     progress.finish();
-    status_ = madeStatus(runner, error);
+    status_ = madeStatus(report, error);
     if (status_ == exitDone) {
-        status_ = writeOutputs(runner.report(), job_.outputs, progress, command_.quiet);
+        status_ = writeOutputs(report, job_.outputs, progress, command_.quiet);
     }
     return status_;
 }

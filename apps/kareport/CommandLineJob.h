@@ -3,18 +3,19 @@
 #include "Commands.h"
 #include "Job.h"
 #include "JobRunner.h"
-#include "JsonNode.h"
+#include "JsonSource.h"
 #include "Progress.h"
+#include "UReportDoc.h"
 
 namespace kareport
 {
 
 /// A job with all that the command line says about it.
-class RenderJob
+class CommandLineJob
 {
 public:
     /// Reads a job. What is wrong with it is said on standard error, and shows in `status`.
-    RenderJob(const RenderCommand &command, Expected<JsonSource> source);
+    CommandLineJob(const RenderCommand &command, Expected<JsonSource> source);
 
     /// `exitDone` while nothing is wrong with the job.
     ExitStatus status() const { return status_; }
@@ -27,14 +28,14 @@ public:
     ExitStatus run(Progress &progress);
 
 private:
-    const Output *streamedOutput() const;
     /// How making the report ended, before its outputs are looked at.
-    ExitStatus madeStatus(JobRunner &runner, const std::optional<InputError> &error);
-    std::optional<ExitStatus> runIntoOutput(JobRunner &runner, const Output &output, Progress &progress);
+    ExitStatus madeStatus(const UReportDoc &report, const std::optional<InputError> &error);
+    std::optional<ExitStatus> runIntoOutput(JobRunner &runner, UReportDoc &report, const Output &output,
+                                            Progress &progress);
     void takeOutputs(std::optional<OutputKind> kindOtherwise);
     void checkOutputs();
     ExitStatus checkSize();
-    bool isTooLarge(const UReportDoc *report) const;
+    bool isTooLarge(const UReportDoc &report) const;
     bool isReaderGone() const;
     ExitStatus failTooLarge(qint64 bytes);
     ExitStatus fail(ExitStatus status, const QString &message);

@@ -1,4 +1,4 @@
-#include "JobSettingsWriter.h"
+#include "JobSettings.h"
 
 #include "DeskPreferences.h"
 #include "JobReader.h"
@@ -25,7 +25,7 @@ bool same(const UJobSettings &a, const UJobSettings &b)
            a.bearingReference == b.bearingReference && a.angleMarks == b.angleMarks;
 }
 
-TEST(JobSettingsWriter, WhatIsWrittenIsReadAgain)
+TEST(DeskPreferences, WhatIsWrittenIsReadAgain)
 {
     std::mt19937 random(7);
     const auto upTo = [&random](int most) { return std::uniform_int_distribution<int>(0, most)(random); };
@@ -56,7 +56,7 @@ TEST(JobSettingsWriter, WhatIsWrittenIsReadAgain)
     setProfileStore(makeMemoryProfile());
 }
 
-TEST(JobSettingsWriter, SpoiledPreferencesAreNoPreferences)
+TEST(DeskPreferences, SpoiledPreferencesAreNoPreferences)
 {
     for (const char *text : {"", "x", "{\"lengthUnit\": \"ell\"}", "{\"surprise\": 1}", "[]"}) {
         setProfileStore(makeMemoryProfile());

@@ -1,10 +1,13 @@
-#include "OutputClash.h"
+#include "JobFiles.h"
 
 #include "FileIdentity.h"
-#include "TemplateSource.h"
 #include "Xlate.h"
 
+#include <QDateTime>
+#include <QFileInfo>
 #include <QHash>
+
+#include <algorithm>
 
 namespace kareport
 {
@@ -23,7 +26,7 @@ QHash<QString, QString> sourcesOf(const Job &job, const QString &path)
         }
     }
     if (job.reportTemplate) {
-        sources.insert(fileIdentity(templatePath(job)),
+        sources.insert(fileIdentity(job.reportTemplate->file),
                        Xlate("\"%1\" is the template of the job: an output of its own was expected"));
     }
     if (!path.isEmpty()) {
@@ -62,6 +65,31 @@ std::optional<OutputClash> outputClash(const Job &job, const QString &path)
         earlier.insert(identity, &output);
     }
     return std::nullopt;
+}
+
+bool isUpToDate(const Job &job, const QString &path)
+{
+    QStringList sources;
+    if (!path.isEmpty()) {
+        sources.append(path);
+    }
+    if (job.reportTemplate) {
+        sources.append(job.reportTemplate->file);
+    }
+    for (const Job::DataSet &set : job.data) {
+        if (!set.csv.isEmpty()) {
+            sources.append(set.csv);
+        }
+    }
+    return !job.outputs.empty() && std::all_of(job.outputs.begin(), job.outputs.end(), [&](const Output &output) {
+        const QFileInfo written(output.file);
+        return !output.isStandardOutput() && written.isFile() &&
+               std::all_of(sources.begin(), sources.end(), [&](const QString &source) {
+                   const QFileInfo info(source);
+                   // What is missing shows as an error when the job runs.
+                   return info.exists() && info.lastModified() < written.lastModified();
+               });
+    });
 }
 
 } // namespace kareport

@@ -1,0 +1,193 @@
+#include "JobOutputs.h"
+
+#include "Interrupt.h"
+#include "PdfExport.h"
+#include "ProcessSetup.h"
+#include "ReplaceFile.h"
+#include "ReportContent.h"
+#include "ReportGuards.h"
+#include "ReportPages.h"
+#include "ReportTextCodec.h"
+#include "RichTextWriter.h"
+#include "SizeLimit.h"
+#include "Xlate.h"
+
+#include <QFile>
+#include <QFileInfo>
+#include <QTextDocument>
+
+#include <algorithm>
+#include <cstdio>
+
+namespace kareport
+{
+
+namespace
+{
+
+QString tooLarge(const Output &output)
+{
+    return Xlate("\"%1\" was not written: it would have more than %2").arg(output.file, sizeText(*output.mostBytes));
+}
+
+/// Whether an output is a file, which is replaced in one step. Anything else cannot be taken back.
+bool isReplaced(const Output &output)
+{
+    const QFileInfo file(output.file);
+    return !output.isStandardOutput() && (file.isFile() || !file.exists());
+}
+
+/// Writes one report to one output.
+class OutputWriting
+{
+public:
+    OutputWriting(UReportDoc &report, const Output &output, Progress &progress)
+        : report_(report), output_(output), progress_(progress)
+    {}
+
+    OutputResult write()
+    {
+        if (output_.mostBytes && !isReplaced(output_) && isTooLarge()) {
+            return {tooLarge(output_)};
+        }
+        if (output_.isStandardOutput()) {
+            return writeStandardOutput();
+        }
+        if (output_.kind == OutputKind::Report && report_.IsEmpty() && !report_.HasLostText()) {
+            return {};
+        }
+        const auto problem =
+            replaceOutput(output_, [this](QIODevice &device, QString &wrong) { return writeTo(device, wrong); });
+        return {problem, false, warnings_};
+    }
+
+private:
+    OutputResult writeStandardOutput()
+    {
+        QFile file;
+        QString problem;
+        if (file.open(stdout, QIODevice::WriteOnly) && writeTo(file, problem) && file.flush()) {
+            return {std::nullopt, false, warnings_};
+        }
+        if (isOutputReaderGone()) {
+            return {std::nullopt, true, warnings_};
+        }
+        return {Xlate("the report could not be written to standard output: %1")
+                    .arg(problem.isEmpty() ? file.errorString() : problem),
+                false, warnings_};
+    }
+
+    /// What is written piece by piece to where it cannot be taken back is measured before.
+    bool isTooLarge()
+    {
+        SizeLimit count(nullptr, *output_.mostBytes);
+        QString problem;
+        const bool isExceeded = !writeTo(count, problem) && count.isExceeded();
+        warnings_.clear(); // they come again
+        return isExceeded;
+    }
+
+    bool writeTo(QIODevice &device, QString &problem)
+    {
+        if (report_.HasLostText()) {
+            return false; // half a report is none
+        }
+        switch (output_.kind) {
+        case OutputKind::Report: return report_.WriteText(device, LineEnds::ReportFile);
+        case OutputKind::Text: return report_.WriteText(device, LineEnds::PlainText);
+        case OutputKind::RichText: return writeRichTextTo(device, problem);
+        case OutputKind::Pdf: return writePdfTo(device, problem);
+        case OutputKind::RichTextImage: return report_.WriteRichTextFile(device);
+        }
+        return false;
+    }
+
+    bool writeRichTextTo(QIODevice &device, QString &problem)
+    {
+        QTextDocument document;
+        RichTextNotes notes;
+        std::optional<RichTextError> error;
+        {
+            // What this writes must not hang on another output that wants the report in rich-text mode.
+            const auto guard = withoutRichTextMode(report_);
+            error = showReportContent(report_, document, &notes);
+        }
+        if (error) {
+            problem = Xlate("the report begins as rich text, but %1 (line %2, column %3)")
+                          .arg(error->text, QString::number(error->place.line), QString::number(error->place.column));
+            return false;
+        }
+        warnings_ += notes.texts();
+        return writeRichText(device, document);
+    }
+
+    bool writePdfTo(QIODevice &device, QString &problem)
+    {
+        PdfNotes notes;
+        const bool done = report_.WritePdf(device, &notes, [this](qint64 page, qint64 pages) {
+            progress_.advance(static_cast<std::size_t>(page), static_cast<std::size_t>(pages));
+            return !isInterrupted() && !(output_.isStandardOutput() && isOutputReaderGone());
+        });
+        problem = notes.problem;
+        warnings_ += notes.warnings();
+        return done;
+    }
+
+    UReportDoc &report_;
+    const Output &output_;
+    Progress &progress_;
+    QStringList warnings_;
+};
+
+} // namespace
+
+std::optional<QString> replaceOutput(const Output &output, const WriteContent &write)
+{
+    QString error;
+    QString problem;
+    bool isTooLarge = false;
+    const auto writeLimited = [&](QIODevice &device) {
+        if (!output.mostBytes) {
+            return write(device, problem);
+        }
+        SizeLimit limited(&device, *output.mostBytes);
+        const bool done = write(limited, problem);
+        isTooLarge = limited.isExceeded();
+        return done;
+    };
+    const bool done = replaceFile(output.file, writeLimited, &error);
+    if (isTooLarge) {
+        return tooLarge(output);
+    }
+    return done ? std::nullopt
+                : std::optional(
+                      Xlate("\"%1\" could not be written: %2").arg(output.file, problem.isEmpty() ? error : problem));
+}
+
+OutputResult writeOutput(UReportDoc &report, const Output &output, Progress &progress)
+{
+    return OutputWriting(report, output, progress).write();
+}
+
+const Output *streamedOutput(const Job &job)
+{
+    const Output &output = job.outputs.front();
+    const bool isText = output.kind == OutputKind::Report || output.kind == OutputKind::Text;
+    const bool isEmptied = std::any_of(job.steps.begin(), job.steps.end(), [](const Job::Step &step) {
+        return std::holds_alternative<Job::Clear>(step.action);
+    });
+    return job.outputs.size() == 1 && isText && isReplaced(output) && !isEmptied ? &output : nullptr;
+}
+
+bool needsFonts(const std::vector<Output> &outputs)
+{
+    return std::any_of(outputs.begin(), outputs.end(),
+                       [](const Output &output) { return output.kind == OutputKind::RichText; });
+}
+
+bool makesNoPage(const UReportDoc &report)
+{
+    return report.IsEmpty() || (report.HoldsRichTextSource() && report.GetPages().empty());
+}
+
+} // namespace kareport

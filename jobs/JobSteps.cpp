@@ -1,0 +1,160 @@
+#include "JobSteps.h"
+
+#include "TemplateCheck.h"
+#include "UXmlReportTpl.h"
+#include "Xlate.h"
+
+#include <new>
+
+namespace kareport
+{
+
+namespace
+{
+
+/// What has been found writable is not written for one reason only.
+void needMemory(bool isWritten)
+{
+    if (!isWritten) {
+        throw std::bad_alloc();
+    }
+}
+
+} // namespace
+
+std::optional<InputError> JobSteps::write()
+{
+    for (const Job::Step &step : job_.steps) {
+        auto wrong = std::visit([&](const auto &action) { return write(action, step.path); }, step.action);
+        if (wrong || isStopped_()) {
+            return wrong;
+        }
+        needMemory(!report_.HasLostText());
+    }
+    return std::nullopt;
+}
+
+JobSteps::Wrong JobSteps::write(const Job::Heading &step, const JsonPath & /*path*/)
+{
+    report_.SetHeading(step.text, step.before, step.after);
+    return std::nullopt;
+}
+
+JobSteps::Wrong JobSteps::write(const Job::Line &step, const JsonPath & /*path*/)
+{
+    report_.WriteLine(step.text, step.before, step.after, step.style);
+    return std::nullopt;
+}
+
+JobSteps::Wrong JobSteps::write(const Job::LineFeed &step, const JsonPath & /*path*/)
+{
+    report_.LineFeed(step.count);
+    return std::nullopt;
+}
+
+JobSteps::Wrong JobSteps::write(const Job::NewPage &step, const JsonPath & /*path*/)
+{
+    report_.NewPage(step.linesNeeded);
+    return std::nullopt;
+}
+
+JobSteps::Wrong JobSteps::write(const Job::Clear & /*step*/, const JsonPath & /*path*/)
+{
+    report_.Clear();
+    return std::nullopt;
+}
+
+JobSteps::Wrong JobSteps::write(const Job::Block &step, const JsonPath &path)
+{
+    const sXmlReportBlock *block = report_.GetTemplate()->GetBlock(step.name);
+    if (block == nullptr) {
+        QStringList names;
+        report_.GetTemplate()->GetAllBlocks(names);
+        return noSuchRecord(Xlate("block"), step.name, names, path);
+    }
+    if (auto wrong = wrongRecord(*block, Xlate("block"), step.name, path)) {
+        return wrong;
+    }
+    const auto opened = openRows(step.data, block->Use, true);
+    if (const InputError *error = errorOf(opened)) {
+        return *error;
+    }
+    RowList &rows = *std::get<std::unique_ptr<RowList>>(opened);
+    // All rows must be good, though only the first one is shown.
+    for (std::size_t row = 0; rows.GetAt(row) != nullptr; ++row) {
+    }
+    if (auto error = rows.error()) {
+        return error;
+    }
+    if (const UDataObject *object = rows.GetAt(0)) {
+        needMemory(report_.WriteDataBlock(step.name, object, step.before, step.after));
+        return std::nullopt;
+    }
+    return isStopped_() ? std::nullopt : std::optional(data_.noRow(step.data, path));
+}
+
+JobSteps::Wrong JobSteps::write(const Job::Table &step, const JsonPath &path)
+{
+    const sXmlReportTable *table = report_.GetTemplate()->GetTable(step.name);
+    if (table == nullptr) {
+        QStringList names;
+        report_.GetTemplate()->GetAllTables(names);
+        return noSuchRecord(Xlate("table"), step.name, names, path);
+    }
+    if (auto wrong = wrongRecord(*table, Xlate("table"), step.name, path)) {
+        return wrong;
+    }
+    const auto opened = openRows(step.data, table->Use, false);
+    if (const InputError *error = errorOf(opened)) {
+        return *error;
+    }
+    RowList &rows = *std::get<std::unique_ptr<RowList>>(opened);
+    needMemory(report_.WriteDataTable(step.name, &rows, step.before, step.after, step.headingAfter));
+    return rows.error();
+}
+
+JobSteps::Wrong JobSteps::noSuchRecord(const QString &what, const QString &name, const QStringList &names,
+                                       const JsonPath &path) const
+{
+    return source_.errorAt(path,
+                           Xlate("the template has no %1 named \"%2\": one of %3 was expected")
+                               .arg(what, name, names.isEmpty() ? Xlate("none") : names.join(QStringLiteral(", "))));
+}
+
+/// What keeps a table or block that the template has from being written.
+template <typename Record>
+JobSteps::Wrong JobSteps::wrongRecord(const Record &record, const QString &what, const QString &name,
+                                      const JsonPath &path) const
+{
+    if (report_.GetTemplate()->GetDictionary(record.Use) == nullptr) {
+        return source_.errorAt(path,
+                               Xlate("the %1 \"%2\" cannot be written: the template has no dictionary named \"%3\"")
+                                   .arg(what, name, record.Use));
+    }
+    for (const sXmlReportField &field : record.Fields) {
+        if (field.Width > widestColumn || field.Width < -widestColumn || field.Decimals > widestColumn) {
+            return source_.errorAt(
+                path, Xlate("the %1 \"%2\" cannot be written: the format of its field \"%3\" is beyond %4 characters")
+                          .arg(what, name, field.VariableName, QString::number(widestColumn)));
+        }
+    }
+    return std::nullopt;
+}
+
+/// The rows of a data set, typed by a dictionary of the template.
+Expected<std::unique_ptr<RowList>> JobSteps::openRows(const QString &data, const QString &dictionary, bool firstOnly)
+{
+    const UXmlReportTpl *tpl = report_.GetTemplate();
+    const DataUnits units = job_.data.constFind(data)->units;
+    const FindVariable findVariable = [tpl, units, dictionary](const QString &variable) -> std::optional<ValueParser> {
+        qint32 id = 0;
+        qint32 type = 0;
+        if (!tpl->FindVariable(dictionary, variable, id, type)) {
+            return std::nullopt;
+        }
+        return ValueParser(type, static_cast<unsigned>(id), units);
+    };
+    return data_.open(data, findVariable, firstOnly);
+}
+
+} // namespace kareport

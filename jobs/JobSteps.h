@@ -1,0 +1,53 @@
+#pragma once
+
+#include "InputError.h"
+#include "Job.h"
+#include "JobData.h"
+#include "JsonSource.h"
+#include "UReportDoc.h"
+
+#include <functional>
+#include <optional>
+
+namespace kareport
+{
+
+/// Writes the steps of a job into a report that has the job's template, one after the other.
+class JobSteps
+{
+public:
+    /// @param source     the job file, for the places of errors
+    /// @param isStopped  is asked after each step
+    JobSteps(const Job &job, const JsonSource &source, JobData &data, UReportDoc &report,
+             const std::function<bool()> &isStopped)
+        : job_(job), source_(source), data_(data), report_(report), isStopped_(isStopped)
+    {}
+
+    /// @return what is wrong with a step or with its data; nothing when all steps were written or the work was stopped
+    /// @throws std::bad_alloc where the report has lost text: half a report is none
+    std::optional<InputError> write();
+
+private:
+    using Wrong = std::optional<InputError>;
+
+    Wrong write(const Job::Heading &step, const JsonPath &path);
+    Wrong write(const Job::Line &step, const JsonPath &path);
+    Wrong write(const Job::LineFeed &step, const JsonPath &path);
+    Wrong write(const Job::NewPage &step, const JsonPath &path);
+    Wrong write(const Job::Clear &step, const JsonPath &path);
+    Wrong write(const Job::Block &step, const JsonPath &path);
+    Wrong write(const Job::Table &step, const JsonPath &path);
+
+    Wrong noSuchRecord(const QString &what, const QString &name, const QStringList &names, const JsonPath &path) const;
+    template <typename Record>
+    Wrong wrongRecord(const Record &record, const QString &what, const QString &name, const JsonPath &path) const;
+    Expected<std::unique_ptr<RowList>> openRows(const QString &data, const QString &dictionary, bool firstOnly);
+
+    const Job &job_;
+    const JsonSource &source_;
+    JobData &data_;
+    UReportDoc &report_;
+    const std::function<bool()> &isStopped_;
+};
+
+} // namespace kareport
