@@ -1,7 +1,7 @@
 #pragma once
 
 #include "DefaultPrinter.h"
-#include "ReportMargins.h"
+#include "PageDefaults.h"
 
 #include <QDateTime>
 #include <QMargins>
@@ -14,13 +14,13 @@ namespace kareport
 /// whoever makes the report says otherwise (`UReportDoc::SetSurroundings`).
 struct ReportSurroundings
 {
-    QString application;               ///< the name that page headers begin with
-    QDateTime time;                    ///< that page headers are dated with
-    DefaultPrinter printer;            ///< that the page is measured on
-    bool isPortrait = true;            ///< whether the page is upright
-    QMargins margins = defaultMargins; ///< hundredths of a millimetre
-    unsigned fontSize = 8;             ///< points
-    bool printHash = false;            ///< whether a value wider than its column prints as "#"
+    QString application;                 ///< the name that page headers begin with
+    QDateTime time;                      ///< that page headers are dated with
+    DefaultPrinter printer;              ///< that the page is measured on
+    bool isPortrait = true;              ///< whether the page is upright
+    QMargins margins = defaultMargins;   ///< hundredths of a millimetre
+    unsigned fontSize = defaultFontSize; ///< points
+    bool printHash = false;              ///< whether a value wider than its column prints as "#"
 };
 
 } // namespace kareport

@@ -956,6 +956,46 @@
         <translation>die Zeile ist länger als %1 Byte: eine Tabelle aus Zeilen wurde erwartet</translation>
     </message>
     <message>
+        <location filename="../jobs/JobData.cpp"/>
+        <source>the data file "%1" cannot be read: %2</source>
+        <translation>die Datendatei „%1“ kann nicht gelesen werden: %2</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobData.cpp"/>
+        <source>Reading %1</source>
+        <translation>%1 wird gelesen</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobData.cpp"/>
+        <source>the data "%1" has no row: a block shows the first one</source>
+        <translation>der Datenbestand „%1“ hat keine Zeile: ein Block zeigt die erste</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobData.cpp"/>
+        <source>a row was expected behind the header row: a block shows the first one</source>
+        <translation>hinter der Kopfzeile wurde eine Zeile erwartet: ein Block zeigt die erste</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobFiles.cpp"/>
+        <source>"%1" is data of the job: an output of its own was expected</source>
+        <translation>„%1“ enthält Daten des Auftrags: eine eigene Ausgabe wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobFiles.cpp"/>
+        <source>"%1" is the template of the job: an output of its own was expected</source>
+        <translation>„%1“ ist die Vorlage des Auftrags: eine eigene Ausgabe wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobFiles.cpp"/>
+        <source>"%1" is the job itself: an output of its own was expected</source>
+        <translation>„%1“ ist der Auftrag selbst: eine eigene Ausgabe wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobFiles.cpp"/>
+        <source>"%1" is the file of the output "%2" already: an output of its own was expected</source>
+        <translation>„%1“ ist schon die Datei der Ausgabe „%2“: eine eigene Ausgabe wurde erwartet</translation>
+    </message>
+    <message>
         <location filename="../jobs/JobList.cpp"/>
         <source>standard input cannot be read: %1</source>
         <translation>die Standardeingabe kann nicht gelesen werden: %1</translation>
@@ -969,6 +1009,26 @@
         <location filename="../jobs/JobList.cpp"/>
         <source>the list of jobs has lines and characters 0 as well: names on lines, or each ended by a character 0, were expected</source>
         <translation>die Liste der Aufträge hat Zeilen und auch Zeichen 0: Namen auf Zeilen, oder jeder mit einem Zeichen 0 beendet, wurden erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobOutputs.cpp"/>
+        <source>"%1" was not written: it would have more than %2</source>
+        <translation>„%1“ wurde nicht geschrieben: die Datei hätte mehr als %2</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobOutputs.cpp"/>
+        <source>the report could not be written to standard output: %1</source>
+        <translation>der Bericht konnte nicht in die Standardausgabe geschrieben werden: %1</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobOutputs.cpp"/>
+        <source>the report begins as rich text, but %1 (line %2, column %3)</source>
+        <translation>der Bericht beginnt als Rich-Text, aber %1 (Zeile %2, Spalte %3)</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobOutputs.cpp"/>
+        <source>"%1" could not be written: %2</source>
+        <translation>„%1“ konnte nicht geschrieben werden: %2</translation>
     </message>
     <message>
         <location filename="../jobs/JobReader.cpp"/>
@@ -1007,36 +1067,6 @@
     </message>
     <message>
         <location filename="../jobs/JobReader.cpp"/>
-        <source>true was expected</source>
-        <translation>true wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>a step was expected: one of heading, line, lineFeed, newPage, block, table, clear</source>
-        <translation>ein Schritt wurde erwartet: einer von heading, line, lineFeed, newPage, block, table, clear</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>a "%1" needs a template: the key "template" was expected in the job</source>
-        <translation>"%1" benötigt eine Vorlage: im Auftrag wurde der Schlüssel "template" erwartet</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>the key "data" with the name of a data set was expected</source>
-        <translation>der Schlüssel "data" mit dem Namen eines Datenbestands wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>there is no data set named "%1" in the job</source>
-        <translation>im Auftrag gibt es keinen Datenbestand namens „%1“</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>the key "report" with a list of steps was expected</source>
-        <translation>der Schlüssel "report" mit einer Liste von Schritten wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
         <source>the key "file" was expected</source>
         <translation>der Schlüssel "file" wurde erwartet</translation>
     </message>
@@ -1044,11 +1074,6 @@
         <location filename="../jobs/JobReader.cpp"/>
         <source>the ending of "%1" says no kind: the key "as" with one of %2 was expected</source>
         <translation>die Endung von „%1“ nennt keine Art: der Schlüssel "as" mit einem dieser Werte wurde erwartet: %2</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>a text that begins with "%1" was expected</source>
-        <translation>ein Text, der mit „%1“ beginnt, wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/JobReader.cpp"/>
@@ -1061,59 +1086,9 @@
         <translation>der Schlüssel "%1" mit einem Text wurde erwartet</translation>
     </message>
     <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>block</source>
-        <translation>Block</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>table</source>
-        <translation>Tabelle</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>the template has no %1 named "%2": one of %3 was expected</source>
-        <translation>%1 „%2“ fehlt in der Vorlage; vorhanden: %3</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>none</source>
-        <translation>keine</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>the %1 "%2" cannot be written: the template has no dictionary named "%3"</source>
-        <translation>%1 „%2“ kann nicht geschrieben werden: die Vorlage hat kein Wörterbuch namens „%3“</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>the %1 "%2" cannot be written: the format of its field "%3" is beyond %4 characters</source>
-        <translation>%1 „%2“ kann nicht geschrieben werden: das Format des Felds „%3“ geht über %4 Zeichen hinaus</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>the data file "%1" cannot be read: %2</source>
-        <translation>die Datendatei „%1“ kann nicht gelesen werden: %2</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>Reading %1</source>
-        <translation>%1 wird gelesen</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>the data "%1" has no row: a block shows the first one</source>
-        <translation>der Datenbestand „%1“ hat keine Zeile: ein Block zeigt die erste</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>a row was expected behind the header row: a block shows the first one</source>
-        <translation>hinter der Kopfzeile wurde eine Zeile erwartet: ein Block zeigt die erste</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>the report could not be made</source>
-        <translation>der Bericht konnte nicht erstellt werden</translation>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>a text that begins with "%1" was expected</source>
+        <translation>ein Text, der mit „%1“ beginnt, wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/JobRunner.cpp"/>
@@ -1126,54 +1101,74 @@
         <translation>es gibt keine Vorlagendatei „%1“</translation>
     </message>
     <message>
-        <location filename="../jobs/JobSettingsReader.cpp"/>
+        <location filename="../jobs/JobSettings.cpp"/>
         <source>a list of three texts was expected</source>
         <translation>eine Liste von drei Texten wurde erwartet</translation>
     </message>
     <message>
-        <location filename="../jobs/JobSettingsReader.cpp"/>
+        <location filename="../jobs/JobSettings.cpp"/>
         <source>one character with a code up to 255, or an empty text, was expected</source>
         <translation>ein Zeichen mit einem Code bis 255 oder ein leerer Text wurde erwartet</translation>
     </message>
     <message>
-        <location filename="../jobs/JsonNode.cpp"/>
-        <source>the key "%1" stands twice in "%2"</source>
-        <translation>der Schlüssel „%1“ kommt in „%2“ zweimal vor</translation>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>block</source>
+        <translation>Block</translation>
     </message>
     <message>
-        <location filename="../jobs/JsonNode.cpp"/>
-        <source>the file cannot be read: %1</source>
-        <translation>die Datei kann nicht gelesen werden: %1</translation>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>table</source>
+        <translation>Tabelle</translation>
     </message>
     <message>
-        <location filename="../jobs/JsonNode.cpp"/>
-        <source>the file is larger than %1 MB: a job was expected</source>
-        <translation>die Datei ist größer als %1 MB: ein Auftrag wurde erwartet</translation>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>the template has no %1 named "%2": one of %3 was expected</source>
+        <translation>%1 „%2“ fehlt in der Vorlage; vorhanden: %3</translation>
     </message>
     <message>
-        <location filename="../jobs/JsonNode.cpp"/>
-        <source>a JSON object was expected: %1</source>
-        <translation>ein JSON-Objekt wurde erwartet: %1</translation>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>none</source>
+        <translation>keine</translation>
     </message>
     <message>
-        <location filename="../jobs/JsonNode.cpp"/>
-        <source>a JSON object was expected</source>
-        <translation>ein JSON-Objekt wurde erwartet</translation>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>the %1 "%2" cannot be written: the template has no dictionary named "%3"</source>
+        <translation>%1 „%2“ kann nicht geschrieben werden: die Vorlage hat kein Wörterbuch namens „%3“</translation>
     </message>
     <message>
-        <location filename="../jobs/JsonNode.cpp"/>
-        <source>the key "%1" stands in line %2 already: each key was expected once</source>
-        <translation>der Schlüssel „%1“ steht schon in Zeile %2: jeder Schlüssel wurde nur einmal erwartet</translation>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>the %1 "%2" cannot be written: the format of its field "%3" is beyond %4 characters</source>
+        <translation>%1 „%2“ kann nicht geschrieben werden: das Format des Felds „%3“ geht über %4 Zeichen hinaus</translation>
     </message>
     <message>
-        <location filename="../jobs/JsonNode.cpp"/>
-        <source>the key "%1" has %2 steps: at most %3 were expected</source>
-        <translation>der Schlüssel „%1“ hat %2 Stufen: höchstens %3 wurden erwartet</translation>
+        <location filename="../jobs/JobStepsReader.cpp"/>
+        <source>true was expected</source>
+        <translation>true wurde erwartet</translation>
     </message>
     <message>
-        <location filename="../jobs/JsonNode.cpp"/>
-        <source>there is no place for the key "%1" in the job</source>
-        <translation>für den Schlüssel "%1" ist im Auftrag kein Platz</translation>
+        <location filename="../jobs/JobStepsReader.cpp"/>
+        <source>a step was expected: one of heading, line, lineFeed, newPage, block, table, clear</source>
+        <translation>ein Schritt wurde erwartet: einer von heading, line, lineFeed, newPage, block, table, clear</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepsReader.cpp"/>
+        <source>a "%1" needs a template: the key "template" was expected in the job</source>
+        <translation>"%1" benötigt eine Vorlage: im Auftrag wurde der Schlüssel "template" erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepsReader.cpp"/>
+        <source>the key "data" with the name of a data set was expected</source>
+        <translation>der Schlüssel "data" mit dem Namen eines Datenbestands wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepsReader.cpp"/>
+        <source>there is no data set named "%1" in the job</source>
+        <translation>im Auftrag gibt es keinen Datenbestand namens „%1“</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepsReader.cpp"/>
+        <source>the key "report" with a list of steps was expected</source>
+        <translation>der Schlüssel "report" mit einer Liste von Schritten wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/JsonNode.cpp"/>
@@ -1216,44 +1211,54 @@
         <translation>der Wert von „%1“ passt nicht: %2 wurde erwartet</translation>
     </message>
     <message>
-        <location filename="../jobs/OutputClash.cpp"/>
-        <source>"%1" is data of the job: an output of its own was expected</source>
-        <translation>„%1“ enthält Daten des Auftrags: eine eigene Ausgabe wurde erwartet</translation>
+        <location filename="../jobs/JsonSource.cpp"/>
+        <source>the key "%1" stands twice in "%2"</source>
+        <translation>der Schlüssel „%1“ kommt in „%2“ zweimal vor</translation>
     </message>
     <message>
-        <location filename="../jobs/OutputClash.cpp"/>
-        <source>"%1" is the template of the job: an output of its own was expected</source>
-        <translation>„%1“ ist die Vorlage des Auftrags: eine eigene Ausgabe wurde erwartet</translation>
+        <location filename="../jobs/JsonSource.cpp"/>
+        <source>the file cannot be read: %1</source>
+        <translation>die Datei kann nicht gelesen werden: %1</translation>
     </message>
     <message>
-        <location filename="../jobs/OutputClash.cpp"/>
-        <source>"%1" is the job itself: an output of its own was expected</source>
-        <translation>„%1“ ist der Auftrag selbst: eine eigene Ausgabe wurde erwartet</translation>
+        <location filename="../jobs/JsonSource.cpp"/>
+        <source>the file is larger than %1 MB: a job was expected</source>
+        <translation>die Datei ist größer als %1 MB: ein Auftrag wurde erwartet</translation>
     </message>
     <message>
-        <location filename="../jobs/OutputClash.cpp"/>
-        <source>"%1" is the file of the output "%2" already: an output of its own was expected</source>
-        <translation>„%1“ ist schon die Datei der Ausgabe „%2“: eine eigene Ausgabe wurde erwartet</translation>
+        <location filename="../jobs/JsonSource.cpp"/>
+        <source>a JSON object was expected: %1</source>
+        <translation>ein JSON-Objekt wurde erwartet: %1</translation>
     </message>
     <message>
-        <location filename="../jobs/OutputWriter.cpp"/>
-        <source>"%1" was not written: it would have more than %2</source>
-        <translation>„%1“ wurde nicht geschrieben: die Datei hätte mehr als %2</translation>
+        <location filename="../jobs/JsonSource.cpp"/>
+        <source>a JSON object was expected</source>
+        <translation>ein JSON-Objekt wurde erwartet</translation>
     </message>
     <message>
-        <location filename="../jobs/OutputWriter.cpp"/>
-        <source>the report could not be written to standard output: %1</source>
-        <translation>der Bericht konnte nicht in die Standardausgabe geschrieben werden: %1</translation>
+        <location filename="../jobs/JsonSource.cpp"/>
+        <source>the key "%1" stands in line %2 already: each key was expected once</source>
+        <translation>der Schlüssel „%1“ steht schon in Zeile %2: jeder Schlüssel wurde nur einmal erwartet</translation>
     </message>
     <message>
-        <location filename="../jobs/OutputWriter.cpp"/>
-        <source>the report begins as rich text, but %1 (line %2, column %3)</source>
-        <translation>der Bericht beginnt als Rich-Text, aber %1 (Zeile %2, Spalte %3)</translation>
+        <location filename="../jobs/JsonSource.cpp"/>
+        <source>the key "%1" has %2 steps: at most %3 were expected</source>
+        <translation>der Schlüssel „%1“ hat %2 Stufen: höchstens %3 wurden erwartet</translation>
     </message>
     <message>
-        <location filename="../jobs/OutputWriter.cpp"/>
-        <source>"%1" could not be written: %2</source>
-        <translation>„%1“ konnte nicht geschrieben werden: %2</translation>
+        <location filename="../jobs/JsonSource.cpp"/>
+        <source>there is no place for the key "%1" in the job</source>
+        <translation>für den Schlüssel "%1" ist im Auftrag kein Platz</translation>
+    </message>
+    <message>
+        <location filename="../jobs/SavedText.cpp"/>
+        <source>a saved report was expected; this is a PDF</source>
+        <translation>ein gespeicherter Bericht wurde erwartet; dies ist eine PDF-Datei</translation>
+    </message>
+    <message>
+        <location filename="../jobs/SavedText.cpp"/>
+        <source>a report file was expected; this is no UTF-8</source>
+        <translation>eine Berichtsdatei wurde erwartet; dies ist kein UTF-8-Text</translation>
     </message>
     <message>
         <location filename="../jobs/TemplateSource.cpp"/>
@@ -1296,6 +1301,46 @@
         <translation>es gibt keine Vorlage namens „%1“; vorhanden: %2</translation>
     </message>
     <message>
+        <location filename="../apps/kareport/CommandLineJob.cpp"/>
+        <source>kareport: the report will have at least %1</source>
+        <translation>kareport: der Bericht wird mindestens %1 haben</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineJob.cpp"/>
+        <source>kareport: nothing was written: the report has at least %1, more than the limit of %2</source>
+        <translation>kareport: nichts wurde geschrieben: der Bericht hat mindestens %1, mehr als die Grenze von %2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineJob.cpp"/>
+        <source>kareport: stopped; nothing was written</source>
+        <translation>kareport: abgebrochen; es wurde nichts geschrieben</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandOutputs.cpp"/>
+        <source>kareport: stopped before "%1" was written</source>
+        <translation>kareport: abgebrochen, bevor „%1“ geschrieben wurde</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandOutputs.cpp"/>
+        <source>kareport: the report is empty: "%1" was not written</source>
+        <translation>kareport: der Bericht ist leer: „%1“ wurde nicht geschrieben</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandOutputs.cpp"/>
+        <source>kareport: the report is empty, and a PDF has a page at least: "%1" was not written</source>
+        <translation>kareport: Der Bericht ist leer, und eine PDF-Datei hat mindestens eine Seite: „%1“ wurde nicht geschrieben</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandOutputs.cpp"/>
+        <source>Writing %1</source>
+        <translation>%1 wird geschrieben</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandOutputs.cpp"/>
+        <source>kareport: warning: "%1": %2</source>
+        <translation>kareport: Warnung: „%1“: %2</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/CommandSetup.cpp"/>
         <source>--as: one of %1 was expected</source>
         <translation>--as: einer dieser Werte wurde erwartet: %1</translation>
@@ -1312,13 +1357,8 @@
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
-        <source>a saved report was expected; this is a PDF</source>
-        <translation>ein gespeicherter Bericht wurde erwartet; dies ist eine PDF-Datei</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/ConvertCommand.cpp"/>
-        <source>a report file was expected; this is no UTF-8</source>
-        <translation>eine Berichtsdatei wurde erwartet; dies ist kein UTF-8-Text</translation>
+        <source>the output "%1" is the report that is read: another one was expected</source>
+        <translation>Die Ausgabe „%1“ ist der Bericht, der gelesen wird: eine andere wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
@@ -1327,38 +1367,8 @@
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
-        <source>the output "%1" is the report that is read: another one was expected</source>
-        <translation>Die Ausgabe „%1“ ist der Bericht, der gelesen wird: eine andere wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>--set: %1</source>
         <translation>--set: %1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/ConvertCommand.cpp"/>
-        <source>kareport: warning: "%1": %2</source>
-        <translation>kareport: Warnung: „%1“: %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputsWriter.cpp"/>
-        <source>kareport: stopped before "%1" was written</source>
-        <translation>kareport: abgebrochen, bevor „%1“ geschrieben wurde</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputsWriter.cpp"/>
-        <source>kareport: the report is empty: "%1" was not written</source>
-        <translation>kareport: der Bericht ist leer: „%1“ wurde nicht geschrieben</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputsWriter.cpp"/>
-        <source>kareport: the report is empty, and a PDF has a page at least: "%1" was not written</source>
-        <translation>kareport: Der Bericht ist leer, und eine PDF-Datei hat mindestens eine Seite: „%1“ wurde nicht geschrieben</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputsWriter.cpp"/>
-        <source>Writing %1</source>
-        <translation>%1 wird geschrieben</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>
@@ -1434,21 +1444,6 @@
         <location filename="../apps/kareport/RenderCommand.cpp"/>
         <source>kareport: all is up to date; nothing was written</source>
         <translation>kareport: alles ist auf dem neuesten Stand; nichts wurde geschrieben</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/RenderJob.cpp"/>
-        <source>kareport: the report will have at least %1</source>
-        <translation>kareport: der Bericht wird mindestens %1 haben</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/RenderJob.cpp"/>
-        <source>kareport: nothing was written: the report has at least %1, more than the limit of %2</source>
-        <translation>kareport: nichts wurde geschrieben: der Bericht hat mindestens %1, mehr als die Grenze von %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/RenderJob.cpp"/>
-        <source>kareport: stopped; nothing was written</source>
-        <translation>kareport: abgebrochen; es wurde nichts geschrieben</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ViewCommand.cpp"/>
@@ -1708,6 +1703,11 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
         <source>it is a folder, a pipe or a device</source>
         <translation>das ist ein Ordner, eine Pipe oder ein Gerät</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
+        <source>the report could not be made</source>
+        <translation>der Bericht konnte nicht erstellt werden</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>

@@ -956,6 +956,46 @@
         <translation>行が %1 バイトを超えています: 行からなる表が必要です</translation>
     </message>
     <message>
+        <location filename="../jobs/JobData.cpp"/>
+        <source>the data file "%1" cannot be read: %2</source>
+        <translation>データファイル「%1」を読み込めません: %2</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobData.cpp"/>
+        <source>Reading %1</source>
+        <translation>読み込み中: %1</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobData.cpp"/>
+        <source>the data "%1" has no row: a block shows the first one</source>
+        <translation>データ「%1」に行がありません: ブロックには最初の行が表示されます</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobData.cpp"/>
+        <source>a row was expected behind the header row: a block shows the first one</source>
+        <translation>見出し行の後に行が必要です: ブロックには最初の行が表示されます</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobFiles.cpp"/>
+        <source>"%1" is data of the job: an output of its own was expected</source>
+        <translation>"%1" はジョブのデータです: 別の出力が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobFiles.cpp"/>
+        <source>"%1" is the template of the job: an output of its own was expected</source>
+        <translation>"%1" はジョブのテンプレートです: 別の出力が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobFiles.cpp"/>
+        <source>"%1" is the job itself: an output of its own was expected</source>
+        <translation>"%1" はジョブそのものです: 別の出力が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobFiles.cpp"/>
+        <source>"%1" is the file of the output "%2" already: an output of its own was expected</source>
+        <translation>"%1" はすでに出力 "%2" のファイルです: 別の出力が必要です</translation>
+    </message>
+    <message>
         <location filename="../jobs/JobList.cpp"/>
         <source>standard input cannot be read: %1</source>
         <translation>標準入力を読み込めません: %1</translation>
@@ -969,6 +1009,26 @@
         <location filename="../jobs/JobList.cpp"/>
         <source>the list of jobs has lines and characters 0 as well: names on lines, or each ended by a character 0, were expected</source>
         <translation>ジョブの一覧に改行と文字コード 0 が混在しています: 名前は 1 行に 1 つ、またはそれぞれ文字コード 0 で終わる必要があります</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobOutputs.cpp"/>
+        <source>"%1" was not written: it would have more than %2</source>
+        <translation>"%1" は書き込まれませんでした: %2 を超えます</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobOutputs.cpp"/>
+        <source>the report could not be written to standard output: %1</source>
+        <translation>帳票を標準出力に書き込めませんでした: %1</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobOutputs.cpp"/>
+        <source>the report begins as rich text, but %1 (line %2, column %3)</source>
+        <translation>帳票はリッチテキストで始まっていますが、エラーがあります: %1 (%2 行 %3 桁)</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobOutputs.cpp"/>
+        <source>"%1" could not be written: %2</source>
+        <translation>「%1」に書き込めませんでした: %2</translation>
     </message>
     <message>
         <location filename="../jobs/JobReader.cpp"/>
@@ -1007,36 +1067,6 @@
     </message>
     <message>
         <location filename="../jobs/JobReader.cpp"/>
-        <source>true was expected</source>
-        <translation>true が必要です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>a step was expected: one of heading, line, lineFeed, newPage, block, table, clear</source>
-        <translation>heading, line, lineFeed, newPage, block, table, clear のいずれかのステップが必要です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>a "%1" needs a template: the key "template" was expected in the job</source>
-        <translation>"%1" にはテンプレートが必要です: ジョブにキー "template" が必要です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>the key "data" with the name of a data set was expected</source>
-        <translation>データセット名を値とするキー "data" が必要です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>there is no data set named "%1" in the job</source>
-        <translation>ジョブに「%1」という名前のデータセットがありません</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>the key "report" with a list of steps was expected</source>
-        <translation>ステップのリストを値とするキー "report" が必要です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
         <source>the key "file" was expected</source>
         <translation>キー "file" が必要です</translation>
     </message>
@@ -1044,11 +1074,6 @@
         <location filename="../jobs/JobReader.cpp"/>
         <source>the ending of "%1" says no kind: the key "as" with one of %2 was expected</source>
         <translation>「%1」の拡張子からは種類がわかりません: キー "as" に次のいずれかを指定する必要があります: %2</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>a text that begins with "%1" was expected</source>
-        <translation>「%1」で始まるテキストが必要です</translation>
     </message>
     <message>
         <location filename="../jobs/JobReader.cpp"/>
@@ -1061,59 +1086,9 @@
         <translation>テキストを値とするキー "%1" が必要です</translation>
     </message>
     <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>block</source>
-        <translation>ブロック</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>table</source>
-        <translation>表</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>the template has no %1 named "%2": one of %3 was expected</source>
-        <translation>テンプレートに「%2」という名前の%1がありません。使用できるもの: %3</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>none</source>
-        <translation>なし</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>the %1 "%2" cannot be written: the template has no dictionary named "%3"</source>
-        <translation>%1「%2」は出力できません: テンプレートに「%3」という名前の辞書がありません</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>the %1 "%2" cannot be written: the format of its field "%3" is beyond %4 characters</source>
-        <translation>%1「%2」は出力できません: フィールド「%3」の書式が %4 文字を超えています</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>the data file "%1" cannot be read: %2</source>
-        <translation>データファイル「%1」を読み込めません: %2</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>Reading %1</source>
-        <translation>読み込み中: %1</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>the data "%1" has no row: a block shows the first one</source>
-        <translation>データ「%1」に行がありません: ブロックには最初の行が表示されます</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>a row was expected behind the header row: a block shows the first one</source>
-        <translation>見出し行の後に行が必要です: ブロックには最初の行が表示されます</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobRunner.cpp"/>
-        <source>the report could not be made</source>
-        <translation>帳票を作成できませんでした</translation>
+        <location filename="../jobs/JobReader.cpp"/>
+        <source>a text that begins with "%1" was expected</source>
+        <translation>「%1」で始まるテキストが必要です</translation>
     </message>
     <message>
         <location filename="../jobs/JobRunner.cpp"/>
@@ -1126,54 +1101,74 @@
         <translation>テンプレートファイル「%1」がありません</translation>
     </message>
     <message>
-        <location filename="../jobs/JobSettingsReader.cpp"/>
+        <location filename="../jobs/JobSettings.cpp"/>
         <source>a list of three texts was expected</source>
         <translation>3 つのテキストのリストが必要です</translation>
     </message>
     <message>
-        <location filename="../jobs/JobSettingsReader.cpp"/>
+        <location filename="../jobs/JobSettings.cpp"/>
         <source>one character with a code up to 255, or an empty text, was expected</source>
         <translation>文字コード 255 以下の 1 文字または空のテキストが必要です</translation>
     </message>
     <message>
-        <location filename="../jobs/JsonNode.cpp"/>
-        <source>the key "%1" stands twice in "%2"</source>
-        <translation>キー「%1」が「%2」に 2 回あります</translation>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>block</source>
+        <translation>ブロック</translation>
     </message>
     <message>
-        <location filename="../jobs/JsonNode.cpp"/>
-        <source>the file cannot be read: %1</source>
-        <translation>ファイルを読み込めません: %1</translation>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>table</source>
+        <translation>表</translation>
     </message>
     <message>
-        <location filename="../jobs/JsonNode.cpp"/>
-        <source>the file is larger than %1 MB: a job was expected</source>
-        <translation>ファイルが %1 MB を超えています: ジョブが必要です</translation>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>the template has no %1 named "%2": one of %3 was expected</source>
+        <translation>テンプレートに「%2」という名前の%1がありません。使用できるもの: %3</translation>
     </message>
     <message>
-        <location filename="../jobs/JsonNode.cpp"/>
-        <source>a JSON object was expected: %1</source>
-        <translation>JSON オブジェクトが必要です: %1</translation>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>none</source>
+        <translation>なし</translation>
     </message>
     <message>
-        <location filename="../jobs/JsonNode.cpp"/>
-        <source>a JSON object was expected</source>
-        <translation>JSON オブジェクトが必要です</translation>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>the %1 "%2" cannot be written: the template has no dictionary named "%3"</source>
+        <translation>%1「%2」は出力できません: テンプレートに「%3」という名前の辞書がありません</translation>
     </message>
     <message>
-        <location filename="../jobs/JsonNode.cpp"/>
-        <source>the key "%1" stands in line %2 already: each key was expected once</source>
-        <translation>キー「%1」はすでに %2 行目にあります: キーはそれぞれ 1 回だけ指定できます</translation>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>the %1 "%2" cannot be written: the format of its field "%3" is beyond %4 characters</source>
+        <translation>%1「%2」は出力できません: フィールド「%3」の書式が %4 文字を超えています</translation>
     </message>
     <message>
-        <location filename="../jobs/JsonNode.cpp"/>
-        <source>the key "%1" has %2 steps: at most %3 were expected</source>
-        <translation>キー「%1」は %2 段階です: %3 段階までです</translation>
+        <location filename="../jobs/JobStepsReader.cpp"/>
+        <source>true was expected</source>
+        <translation>true が必要です</translation>
     </message>
     <message>
-        <location filename="../jobs/JsonNode.cpp"/>
-        <source>there is no place for the key "%1" in the job</source>
-        <translation>ジョブにはキー "%1" を設定できません</translation>
+        <location filename="../jobs/JobStepsReader.cpp"/>
+        <source>a step was expected: one of heading, line, lineFeed, newPage, block, table, clear</source>
+        <translation>heading, line, lineFeed, newPage, block, table, clear のいずれかのステップが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepsReader.cpp"/>
+        <source>a "%1" needs a template: the key "template" was expected in the job</source>
+        <translation>"%1" にはテンプレートが必要です: ジョブにキー "template" が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepsReader.cpp"/>
+        <source>the key "data" with the name of a data set was expected</source>
+        <translation>データセット名を値とするキー "data" が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepsReader.cpp"/>
+        <source>there is no data set named "%1" in the job</source>
+        <translation>ジョブに「%1」という名前のデータセットがありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepsReader.cpp"/>
+        <source>the key "report" with a list of steps was expected</source>
+        <translation>ステップのリストを値とするキー "report" が必要です</translation>
     </message>
     <message>
         <location filename="../jobs/JsonNode.cpp"/>
@@ -1216,44 +1211,54 @@
         <translation>「%1」の値が不正です: %2が必要です</translation>
     </message>
     <message>
-        <location filename="../jobs/OutputClash.cpp"/>
-        <source>"%1" is data of the job: an output of its own was expected</source>
-        <translation>"%1" はジョブのデータです: 別の出力が必要です</translation>
+        <location filename="../jobs/JsonSource.cpp"/>
+        <source>the key "%1" stands twice in "%2"</source>
+        <translation>キー「%1」が「%2」に 2 回あります</translation>
     </message>
     <message>
-        <location filename="../jobs/OutputClash.cpp"/>
-        <source>"%1" is the template of the job: an output of its own was expected</source>
-        <translation>"%1" はジョブのテンプレートです: 別の出力が必要です</translation>
+        <location filename="../jobs/JsonSource.cpp"/>
+        <source>the file cannot be read: %1</source>
+        <translation>ファイルを読み込めません: %1</translation>
     </message>
     <message>
-        <location filename="../jobs/OutputClash.cpp"/>
-        <source>"%1" is the job itself: an output of its own was expected</source>
-        <translation>"%1" はジョブそのものです: 別の出力が必要です</translation>
+        <location filename="../jobs/JsonSource.cpp"/>
+        <source>the file is larger than %1 MB: a job was expected</source>
+        <translation>ファイルが %1 MB を超えています: ジョブが必要です</translation>
     </message>
     <message>
-        <location filename="../jobs/OutputClash.cpp"/>
-        <source>"%1" is the file of the output "%2" already: an output of its own was expected</source>
-        <translation>"%1" はすでに出力 "%2" のファイルです: 別の出力が必要です</translation>
+        <location filename="../jobs/JsonSource.cpp"/>
+        <source>a JSON object was expected: %1</source>
+        <translation>JSON オブジェクトが必要です: %1</translation>
     </message>
     <message>
-        <location filename="../jobs/OutputWriter.cpp"/>
-        <source>"%1" was not written: it would have more than %2</source>
-        <translation>"%1" は書き込まれませんでした: %2 を超えます</translation>
+        <location filename="../jobs/JsonSource.cpp"/>
+        <source>a JSON object was expected</source>
+        <translation>JSON オブジェクトが必要です</translation>
     </message>
     <message>
-        <location filename="../jobs/OutputWriter.cpp"/>
-        <source>the report could not be written to standard output: %1</source>
-        <translation>帳票を標準出力に書き込めませんでした: %1</translation>
+        <location filename="../jobs/JsonSource.cpp"/>
+        <source>the key "%1" stands in line %2 already: each key was expected once</source>
+        <translation>キー「%1」はすでに %2 行目にあります: キーはそれぞれ 1 回だけ指定できます</translation>
     </message>
     <message>
-        <location filename="../jobs/OutputWriter.cpp"/>
-        <source>the report begins as rich text, but %1 (line %2, column %3)</source>
-        <translation>帳票はリッチテキストで始まっていますが、エラーがあります: %1 (%2 行 %3 桁)</translation>
+        <location filename="../jobs/JsonSource.cpp"/>
+        <source>the key "%1" has %2 steps: at most %3 were expected</source>
+        <translation>キー「%1」は %2 段階です: %3 段階までです</translation>
     </message>
     <message>
-        <location filename="../jobs/OutputWriter.cpp"/>
-        <source>"%1" could not be written: %2</source>
-        <translation>「%1」に書き込めませんでした: %2</translation>
+        <location filename="../jobs/JsonSource.cpp"/>
+        <source>there is no place for the key "%1" in the job</source>
+        <translation>ジョブにはキー "%1" を設定できません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/SavedText.cpp"/>
+        <source>a saved report was expected; this is a PDF</source>
+        <translation>保存された帳票が必要です。これは PDF です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/SavedText.cpp"/>
+        <source>a report file was expected; this is no UTF-8</source>
+        <translation>帳票ファイルが必要です。これは UTF-8 ではありません</translation>
     </message>
     <message>
         <location filename="../jobs/TemplateSource.cpp"/>
@@ -1296,6 +1301,46 @@
         <translation>「%1」という名前のテンプレートがありません。使用できるもの: %2</translation>
     </message>
     <message>
+        <location filename="../apps/kareport/CommandLineJob.cpp"/>
+        <source>kareport: the report will have at least %1</source>
+        <translation>kareport: レポートは少なくとも %1 になります</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineJob.cpp"/>
+        <source>kareport: nothing was written: the report has at least %1, more than the limit of %2</source>
+        <translation>kareport: 何も書き込まれませんでした: レポートは少なくとも %1 で、上限の %2 を超えます</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineJob.cpp"/>
+        <source>kareport: stopped; nothing was written</source>
+        <translation>kareport: 中断されました。何も書き込まれていません</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandOutputs.cpp"/>
+        <source>kareport: stopped before "%1" was written</source>
+        <translation>kareport: 「%1」を書き込む前に中断されました</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandOutputs.cpp"/>
+        <source>kareport: the report is empty: "%1" was not written</source>
+        <translation>kareport: 帳票が空です: 「%1」は書き込まれませんでした</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandOutputs.cpp"/>
+        <source>kareport: the report is empty, and a PDF has a page at least: "%1" was not written</source>
+        <translation>kareport: レポートが空です。PDF には少なくとも 1 ページが必要なため、「%1」は書き込まれませんでした</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandOutputs.cpp"/>
+        <source>Writing %1</source>
+        <translation>書き込み中: %1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandOutputs.cpp"/>
+        <source>kareport: warning: "%1": %2</source>
+        <translation>kareport: 警告: 「%1」: %2</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/CommandSetup.cpp"/>
         <source>--as: one of %1 was expected</source>
         <translation>--as: 次のいずれかが必要です: %1</translation>
@@ -1312,13 +1357,8 @@
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
-        <source>a saved report was expected; this is a PDF</source>
-        <translation>保存された帳票が必要です。これは PDF です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/ConvertCommand.cpp"/>
-        <source>a report file was expected; this is no UTF-8</source>
-        <translation>帳票ファイルが必要です。これは UTF-8 ではありません</translation>
+        <source>the output "%1" is the report that is read: another one was expected</source>
+        <translation>出力 "%1" は読み込むレポートそのものです: 別の出力が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
@@ -1327,38 +1367,8 @@
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
-        <source>the output "%1" is the report that is read: another one was expected</source>
-        <translation>出力 "%1" は読み込むレポートそのものです: 別の出力が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>--set: %1</source>
         <translation>--set: %1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/ConvertCommand.cpp"/>
-        <source>kareport: warning: "%1": %2</source>
-        <translation>kareport: 警告: 「%1」: %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputsWriter.cpp"/>
-        <source>kareport: stopped before "%1" was written</source>
-        <translation>kareport: 「%1」を書き込む前に中断されました</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputsWriter.cpp"/>
-        <source>kareport: the report is empty: "%1" was not written</source>
-        <translation>kareport: 帳票が空です: 「%1」は書き込まれませんでした</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputsWriter.cpp"/>
-        <source>kareport: the report is empty, and a PDF has a page at least: "%1" was not written</source>
-        <translation>kareport: レポートが空です。PDF には少なくとも 1 ページが必要なため、「%1」は書き込まれませんでした</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/OutputsWriter.cpp"/>
-        <source>Writing %1</source>
-        <translation>書き込み中: %1</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>
@@ -1434,21 +1444,6 @@
         <location filename="../apps/kareport/RenderCommand.cpp"/>
         <source>kareport: all is up to date; nothing was written</source>
         <translation>kareport: すべて最新です。何も書き込みませんでした</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/RenderJob.cpp"/>
-        <source>kareport: the report will have at least %1</source>
-        <translation>kareport: レポートは少なくとも %1 になります</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/RenderJob.cpp"/>
-        <source>kareport: nothing was written: the report has at least %1, more than the limit of %2</source>
-        <translation>kareport: 何も書き込まれませんでした: レポートは少なくとも %1 で、上限の %2 を超えます</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/RenderJob.cpp"/>
-        <source>kareport: stopped; nothing was written</source>
-        <translation>kareport: 中断されました。何も書き込まれていません</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ViewCommand.cpp"/>
@@ -1708,6 +1703,11 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
         <source>it is a folder, a pipe or a device</source>
         <translation>フォルダー、パイプ、またはデバイスです</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
+        <source>the report could not be made</source>
+        <translation>帳票を作成できませんでした</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>

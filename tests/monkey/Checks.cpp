@@ -111,7 +111,8 @@ QString World::checkClosed() const
             continue;
         }
         if (--given < 0) {
-            return nameOf(gone) + QStringLiteral(" was closed with changes that nobody gave up");
+            return nameOf(gone) + QStringLiteral(" was closed with changes that nobody gave up") +
+                   describeWritten(gone.text);
         }
     }
     return {};

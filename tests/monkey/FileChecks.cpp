@@ -80,6 +80,21 @@ bool World::isKept(const QString &text) const
     return std::any_of(written.begin(), written.end(), [&text](const QString &path) { return loadsAs(path, text); });
 }
 
+QString World::describeWritten(const QString &text) const
+{
+    constexpr int shown = 120;
+    const auto start = [&](const QByteArray &bytes) {
+        return QString::fromLatin1(bytes.first(qMin(bytes.size(), shown)).toPercentEncoding(" {}\\\""));
+    };
+    QString described = QStringLiteral("\n  text of %1: %2").arg(text.size()).arg(start(text.toUtf8()));
+    for (const QString &path : writtenFiles()) {
+        QFile file(path);
+        const QByteArray content = file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
+        described += QStringLiteral("\n  %1 of %2: %3").arg(path).arg(content.size()).arg(start(content));
+    }
+    return described;
+}
+
 QString World::checkFiles() const
 {
     for (const UReportDoc *report : reports()) {
@@ -87,7 +102,7 @@ QString World::checkFiles() const
         const bool isSaved = was != nullptr && was->isModified && !report->IsModified() && !isReloaded(*was);
         const QString text = textOf(*report);
         if (isSaved && !text.isEmpty() && !isKept(text)) {
-            return QStringLiteral("%1 counts as saved and is in no file").arg(was->title);
+            return QStringLiteral("%1 counts as saved and is in no file").arg(was->title) + describeWritten(text);
         }
     }
     return {};

@@ -98,6 +98,8 @@ private:
     /// Files that were written since the step began.
     QStringList writtenFiles() const;
     bool isKept(const QString &text) const;
+    /// A text that is kept nowhere, and what was written: their beginnings.
+    QString describeWritten(const QString &text) const;
     /// Whether the user let the desk load the file of a report again.
     bool isReloaded(const Seen &was) const;
     static bool isRich(const UReportDoc &report);

@@ -2,6 +2,7 @@
 
 #include "DefaultPrinter.h"
 #include "PageDefaults.h"
+#include "PageMeasurement.h"
 #include "Profile.h"
 
 #include <gtest/gtest.h>
@@ -45,13 +46,13 @@ TEST(PageLayout, WhatIsGivenTakesThePlaceOfWhatIsMeasured)
 {
     const FixedSurroundings surroundings;
     PageLayout measured;
-    ASSERT_TRUE(measured.measure());
+    ASSERT_TRUE(measured.measure(kareport::reportPageDevice()));
 
     PageLayout layout;
     layout.give(50, std::nullopt);
     EXPECT_EQ(layout.geometry().linesPerPage, 50);
     EXPECT_EQ(layout.geometry().charsPerRow, 80) << "not measured yet";
-    ASSERT_TRUE(layout.measure());
+    ASSERT_TRUE(layout.measure(kareport::reportPageDevice()));
     EXPECT_EQ(layout.geometry().linesPerPage, 50);
     EXPECT_EQ(layout.geometry().charsPerRow, measured.geometry().charsPerRow);
     EXPECT_EQ(layout.geometry().pageSize, measured.geometry().pageSize);
@@ -60,7 +61,7 @@ TEST(PageLayout, WhatIsGivenTakesThePlaceOfWhatIsMeasured)
     EXPECT_EQ(layout.geometry().linesPerPage, 50) << "until it is measured";
     EXPECT_FALSE(layout.isGiven());
     EXPECT_EQ(layout.givenLinesPerPage(), 50);
-    ASSERT_TRUE(layout.measure());
+    ASSERT_TRUE(layout.measure(kareport::reportPageDevice()));
     EXPECT_EQ(layout.geometry().linesPerPage, measured.geometry().linesPerPage);
 
     layout.useGiven(true);
@@ -72,7 +73,7 @@ TEST(PageLayout, WithoutAPrinterTheFiguresStay)
     const FixedSurroundings surroundings;
     kareport::setDefaultPrinter({kareport::PrinterSource::None});
     PageLayout layout;
-    EXPECT_FALSE(layout.measure());
+    EXPECT_FALSE(layout.measure(kareport::reportPageDevice()));
     EXPECT_EQ(layout.geometry().linesPerPage, kareport::defaultLinesPerPage);
     EXPECT_EQ(layout.geometry().pageSize, QSize(0, 0));
 }
