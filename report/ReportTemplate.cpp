@@ -24,7 +24,10 @@ QString fileIn(QString folder, const QString &fileName)
 
 QStringList templatePaths(const QString &fileName)
 {
-    return {fileIn(GetLibraryDir(false), fileName), fileIn(GetStartPathName(), fileName)};
+    QStringList paths; // one after the other: a list of its members in braces does not survive when memory ends
+    paths.append(fileIn(GetLibraryDir(false), fileName));
+    paths.append(fileIn(GetStartPathName(), fileName));
+    return paths;
 }
 
 bool ReportTemplate::load(const QStringList &paths, const QString &templateName, const QString &tableName,

@@ -12,6 +12,9 @@
 #include <ReportWindowEntry.h>
 #include <SaveDialog.h>
 #include <UApplication.h>
+#include <UDataObjectList.h>
+#include <UJobSettings.h>
+#include <UPointNumber.h>
 #include <UReportDoc.h>
 #include <UXTPMDIFrameWnd.h>
 

@@ -40,9 +40,11 @@ QString seenOf(View rich)
 bool showsSame(const QByteArray &rich, const QString &text)
 {
     const QString seen = seenOf(QByteArrayView(rich));
-    return kareport::isRichText(text)
-               ? seen == seenOf(QStringView(text)) || seen == seenOf(QByteArrayView(text.toLatin1()))
-               : seen == plainLines(text);
+    if (seen == plainLines(text)) {
+        return true; // also what somebody typed that reads like rich text
+    }
+    return kareport::isRichText(text) &&
+           (seen == seenOf(QStringView(text)) || seen == seenOf(QByteArrayView(text.toLatin1())));
 }
 
 /// Whether a file holds a text, as whoever opens it reads it.
