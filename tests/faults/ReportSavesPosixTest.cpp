@@ -143,6 +143,22 @@ TEST(ReportSaves, AnOutputOfTheCommandLineIsWholeOrNotWritten)
     }
 }
 
+TEST(ReportSaves, AFullDiskIsSaidInTheSystemsWords)
+{
+    using kareport::OutputKind;
+    const QTemporaryDir folder;
+    ShownReport shown(longText());
+    shown.report.SetPageSize();
+    for (const OutputKind kind : {OutputKind::Report, OutputKind::Text, OutputKind::RichText, OutputKind::Pdf}) {
+        const FailingFiles failing(Call::Write, 1);
+        kareport::Progress progress(false);
+        const auto result = kareport::writeOutput(shown.report, {folder.filePath(QStringLiteral("a")), kind}, progress);
+        EXPECT_TRUE(failing.hasFailed());
+        EXPECT_TRUE(result.problem.value_or(QString()).contains(QStringLiteral("No space left on device")))
+            << static_cast<int>(kind) << ": " << result.problem.value_or(QString()).toStdString();
+    }
+}
+
 TEST(ReportSaves, AJobThatGoesStraightToItsFileIsWholeOrNotWritten)
 {
     const FixedSurroundings surroundings;
