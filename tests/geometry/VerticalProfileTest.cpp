@@ -64,7 +64,8 @@ TEST(VerticalProfile, HeightsAndGradesAreThoseOfTheFormulas)
 
 TEST(VerticalProfile, TheVertexSaysWhereItsCurveIs)
 {
-    const auto &vertex = crest().vertices()[1];
+    const VerticalProfile profile = crest();
+    const auto &vertex = profile.vertices()[1];
     EXPECT_EQ(vertex.start, 150);
     EXPECT_EQ(vertex.end, 250);
     EXPECT_DOUBLE_EQ(vertex.gradeIn, 0.02);
