@@ -26,6 +26,16 @@ END
 good=(-O2 -U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=2 -fstack-protector-strong -fPIE -pie -Wl,-z,relro -Wl,-z,now)
 [ "$(uname -m)" != x86_64 ] || good+=(-fcf-protection)
 
+# What differs in how it is linked only is compiled once.
+compile() { # options of the compiler; sets `object`
+    local option options=()
+    for option; do
+        [[ $option == -Wl,* ]] || options+=("$option")
+    done
+    object=$folder/main$(printf '%s' "${options[@]}").o
+    [ -f "$object" ] || "$compiler" "${good[@]}" "${options[@]}" -c -o "$object" "$folder/main.cpp"
+}
+
 failed=0
 expect() { # what is said, empty for nothing; options of the check before "--", of the compiler after it
     local said=$1 options=() output
@@ -35,7 +45,8 @@ expect() { # what is said, empty for nothing; options of the check before "--", 
         shift
     done
     shift
-    "$compiler" "${good[@]}" "$@" -o "$folder/program" "$folder/main.cpp"
+    compile "$@"
+    "$compiler" "${good[@]}" "$@" -o "$folder/program" "$object"
     output=$(scripts/check-binaries.sh "${options[@]}" "$folder/program" || true)
     if [ -z "$said" ] && [ -n "$output" ] || ! grep -qF -- "$said" <<< "$output"; then
         printf 'with %s: "%s" was expected, this was said: %s\n' "$*" "$said" "$output"
