@@ -188,12 +188,12 @@ TEST(UReportView, FormatsThatAreNotDrawnAreSavedAgain)
 
 TEST(UReportView, ALongReportIsShownWhole)
 {
-    ShownReport t(reportLines(QStringLiteral("line\n")).repeated(1'000'000));
+    ShownReport t(reportLines(QStringLiteral("line\n")).repeated(200'000));
     UReportView &view = t.open();
-    EXPECT_EQ(view.GetEdit().blockCount(), 1'000'001);
-    putCursor(view.GetEdit(), 5 * 1'000'000);
+    EXPECT_EQ(view.GetEdit().blockCount(), 200'001);
+    putCursor(view.GetEdit(), 5 * 200'000);
     QTest::keyClick(&view.GetEdit(), Qt::Key_X);
-    EXPECT_EQ(t.report.GetTextLength(), 6'000'001);
+    EXPECT_EQ(t.report.GetTextLength(), 1'200'001);
     EXPECT_TRUE(textOf(t.report).endsWith(QStringLiteral("line\r\nx")));
 }
 
