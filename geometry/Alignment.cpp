@@ -25,11 +25,20 @@ std::optional<CurvePlace> Alignment::at(double distance, bool before) const
         return std::nullopt;
     }
     std::size_t index = elementAt(distance);
-    if (before && index > 0 && distance <= elements_[index].start) {
+    // A distance that misses a border by its last digits is on it.
+    if (before && index > 0 && distance <= elements_[index].start + rounding) {
         --index;
+    } else if (!before && index + 1 < elements_.size() && distance >= elements_[index + 1].start - rounding) {
+        ++index;
     }
     const Element &element = elements_[index];
-    return element.curve.at((distance - element.start) * (element.curve.length() / element.length));
+    double along = distance - element.start;
+    if (along < rounding) {
+        along = 0;
+    } else if (along > element.length - rounding) {
+        along = element.length;
+    }
+    return element.curve.at(along * (element.curve.length() / element.length));
 }
 
 } // namespace kareport

@@ -114,7 +114,10 @@ double PlaneCurve::curvatureAt(double length) const
     if (startCurvature_ != endCurvature_ && isOverTangent(form_)) {
         return localAt(length).curvature;
     }
-    const double part = std::clamp(length / length_, 0.0, 1.0);
+    if (length >= length_) {
+        return endCurvature_; // to the last digit: it may be that of a line
+    }
+    const double part = std::max(length / length_, 0.0);
     return startCurvature_ + (endCurvature_ - startCurvature_) * transitionGrowth(form_, part);
 }
 

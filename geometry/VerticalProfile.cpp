@@ -181,8 +181,13 @@ std::vector<ProfileExtreme> VerticalProfile::extremes(double from, double to) co
             found.push_back({station, heightOn(piece, station), isHigh});
         }
     };
+    // From the piece before the first one on, which says how the grade comes there.
+    const auto next = std::upper_bound(pieces_.begin(), pieces_.end(), from,
+                                       [](double at, const Piece &piece) { return at < piece.start; });
     double before = 0; // the last grade that was not level; 0 after a level stretch
-    for (const Piece &piece : pieces_) {
+    for (auto at = next - std::min<std::ptrdiff_t>(2, next - pieces_.begin()); at != pieces_.end() && at->start <= to;
+         ++at) {
+        const Piece &piece = *at;
         const double first = piece.grade;
         const double last = gradeOn(piece, piece.end);
         const double after = first != 0 ? first : last;

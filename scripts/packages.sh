@@ -13,6 +13,7 @@ packages_build=(
     qt6-l10n-tools          # translations
     libcli11-dev            # the command line
     libhpdf-dev             # PDF
+    libexpat1-dev           # LandXML files
     libfontconfig-dev       # where the faces of a PDF are
     libfreetype-dev         # what the glyphs of a PDF are put together from
     fonts-dejavu-core       # the fixed-pitch face that a page is measured with, and of a PDF

@@ -21,8 +21,13 @@ public:
     /// Opening and reading a pipe, which may wait, ends when the program is interrupted.
     static Expected<std::shared_ptr<const FileBytes>> open(const QString &path);
 
+    /// Bytes that are in memory already. @param path  names them in messages
+    static std::shared_ptr<const FileBytes> holding(const QString &path, const QByteArray &content);
+
     std::string_view view() const { return view_; }
     const QString &path() const { return path_; }
+    /// Says that what stands before a byte is not read again soon.
+    void release(std::size_t end) const { mapped_.release(end); }
     /// What went wrong since the file was opened: bytes that were cut off meanwhile read as zeros. It must be asked when all
     /// was read, and when what was read is wrong.
     std::optional<InputError> lostBytes() const;

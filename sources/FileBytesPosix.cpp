@@ -75,6 +75,15 @@ Expected<std::shared_ptr<const FileBytes>> FileBytes::open(const QString &path)
     return std::shared_ptr<const FileBytes>(std::move(bytes));
 }
 
+std::shared_ptr<const FileBytes> FileBytes::holding(const QString &path, const QByteArray &content)
+{
+    auto bytes = std::make_shared<FileBytes>();
+    bytes->path_ = path;
+    bytes->content_ = content;
+    bytes->view_ = {bytes->content_.constData(), static_cast<std::size_t>(bytes->content_.size())};
+    return bytes;
+}
+
 /// Reads a file of a size, or until its end one that has none. @return what is wrong with it
 std::optional<QString> FileBytes::read(qint64 size)
 {

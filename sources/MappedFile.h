@@ -21,6 +21,9 @@ public:
     bool map(int handle, std::size_t size);
     std::string_view view() const { return {begin_, size_}; }
     bool isLost() const;
+    /// Gives the memory of what stands before a byte back to the system: a large file that is read in one pass is then
+    /// never in memory as a whole. What is read there again comes from the file again.
+    void release(std::size_t end) const;
 
 private:
     char *begin_ = nullptr;

@@ -94,6 +94,16 @@ MappedFile::~MappedFile()
     }
 }
 
+void MappedFile::release(std::size_t end) const
+{
+    // Now and then: for each block it would cost more than the memory is worth.
+    constexpr std::size_t piece = std::size_t(1) << 22;
+    const std::size_t whole = end / piece * piece;
+    if (begin_ != nullptr && whole >= piece && end - whole < piece / 32) {
+        madvise(begin_ + (whole - piece), piece, MADV_DONTNEED);
+    }
+}
+
 bool MappedFile::isLost() const
 {
     return begin_ != nullptr && slots[slot_].isLost;

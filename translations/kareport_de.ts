@@ -956,6 +956,291 @@
         <translation>die Zeile ist länger als %1 Byte: eine Tabelle aus Zeilen wurde erwartet</translation>
     </message>
     <message>
+        <location filename="../sources/landxml/AlignmentRows.cpp"/>
+        <source>high point</source>
+        <translation>Hochpunkt</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/AlignmentRows.cpp"/>
+        <source>low point</source>
+        <translation>Tiefpunkt</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the element has no geometry: a radius above zero was expected</source>
+        <translation>das Element hat keine Geometrie: ein Halbmesser über null wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the element has no geometry: a length above zero was expected</source>
+        <translation>das Element hat keine Geometrie: eine Länge über null wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the element winds round too often</source>
+        <translation>das Element windet sich zu oft im Kreis</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the element leaves its tangent by more than 45 degrees, which its form cannot</source>
+        <translation>das Element weicht um mehr als 45 Grad von seiner Tangente ab, was seine Form nicht kann</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the element is curved at both ends, which its form cannot be: a straight end was expected</source>
+        <translation>das Element ist an beiden Enden gekrümmt, was seine Form nicht kann: ein gerades Ende wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the element has no geometry: %1 was expected</source>
+        <translation>das Element hat keine Geometrie: %1 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the point "%1" is not in the file</source>
+        <translation>der Punkt „%1“ ist nicht in der Datei</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the element has no geometry: its radius does not reach from its start to its end</source>
+        <translation>das Element hat keine Geometrie: sein Halbmesser reicht nicht vom Anfang zum Ende</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>not supported: a transition of the form "%1"</source>
+        <translation>nicht unterstützt: ein Übergangsbogen der Form „%1“</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>%1 is %2 in the file, but %3 by its geometry</source>
+        <translation>%1 ist in der Datei %2, nach der Geometrie aber %3</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>%1 is %2 beside the tangents of the element: perhaps the element bends to the other side</source>
+        <translation>%1 liegt %2 neben den Tangenten des Elements: vielleicht biegt das Element zur anderen Seite</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the grade line has fewer than two points</source>
+        <translation>die Gradiente hat weniger als zwei Punkte</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the grade line has no heights: a length or a radius above zero was expected</source>
+        <translation>die Gradiente hat keine Höhen: eine Länge oder ein Halbmesser über null wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the grade line has no heights: a station ahead of that of the point before was expected</source>
+        <translation>die Gradiente hat keine Höhen: eine Station hinter der des vorigen Punkts wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the first or the last point of the grade line has a curve, where only one grade meets</source>
+        <translation>der erste oder letzte Punkt der Gradiente hat eine Ausrundung, wo nur eine Neigung ist</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the vertical curve begins before the curve of the point before has ended</source>
+        <translation>die Ausrundung beginnt, bevor die des vorigen Punkts zu Ende ist</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlList.cpp"/>
+        <source>the dictionary has none of the variables of this list, which are: %1</source>
+        <translation>das Verzeichnis hat keine der Variablen dieser Liste; das sind: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlList.cpp"/>
+        <source>the value of the variable "%1" does not fit: %2 was expected</source>
+        <translation>der Wert der Variablen „%1“ passt nicht: %2 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlNotes.cpp"/>
+        <source>and %1 more such differences</source>
+        <translation>und %1 weitere solche Abweichungen</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlNotes.cpp"/>
+        <source>%1: %2 in the file, which no list reads</source>
+        <translation>%1: %2 in der Datei, die keine Liste liest</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlNotes.cpp"/>
+        <source>elements of other kinds: %1 in the file, which no list reads</source>
+        <translation>Elemente anderer Arten: %1 in der Datei, die keine Liste liest</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReader.cpp"/>
+        <source>the element holds more than %1 bytes of text</source>
+        <translation>das Element enthält mehr als %1 Byte Text</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReaderAttributes.cpp"/>
+        <source>the attribute %1 was expected</source>
+        <translation>das Attribut %1 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReaderAttributes.cpp"/>
+        <source>the attribute %1="%2" does not fit: a number was expected</source>
+        <translation>das Attribut %1="%2" passt nicht: eine Zahl wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReaderAttributes.cpp"/>
+        <source>the attribute %1="%2" does not fit: an angle in the file's unit was expected</source>
+        <translation>das Attribut %1="%2" passt nicht: ein Winkel in der Einheit der Datei wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReaderText.cpp"/>
+        <source>"%1" does not fit: a number was expected</source>
+        <translation>„%1“ passt nicht: eine Zahl wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReaderText.cpp"/>
+        <source>signs stand apart from their numbers, to which they were taken to belong</source>
+        <translation>Vorzeichen stehen getrennt von ihren Zahlen, denen sie zugeordnet wurden</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReaderText.cpp"/>
+        <source>the coordinates "%1" do not fit: northing, easting and perhaps a height were expected</source>
+        <translation>die Koordinaten „%1“ passen nicht: Hochwert, Rechtswert und vielleicht eine Höhe wurden erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReaderText.cpp"/>
+        <source>"%1" does not fit: two numbers were expected</source>
+        <translation>„%1“ passt nicht: zwei Zahlen wurden erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReaderText.cpp"/>
+        <source>the list of numbers ends within a point, which is passed over</source>
+        <translation>die Zahlenliste endet mitten in einem Punkt, der übergangen wird</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRoute.cpp"/>
+        <source>the element has no length and is passed over</source>
+        <translation>das Element hat keine Länge und wird übergangen</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRoute.cpp"/>
+        <source>the elements wind round too often</source>
+        <translation>die Elemente winden sich zu oft im Kreis</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRoute.cpp"/>
+        <source>the station equation is not ahead of the start and of the equations before it, or has no numbers: staInternal or staBack, and staAhead were expected</source>
+        <translation>die Stationsgleichung liegt nicht hinter dem Anfang und den Gleichungen davor, oder ihr fehlen Zahlen: staInternal oder staBack, und staAhead wurden erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRows.cpp"/>
+        <source>the file is of version %1: what is read are versions 1.0 to 2.0</source>
+        <translation>die Datei ist von Version %1: gelesen werden die Versionen 1.0 bis 2.0</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlUnits.cpp"/>
+        <source>the file has no units: Metric or Imperial in Units was expected</source>
+        <translation>die Datei hat keine Einheiten: Metric oder Imperial in Units wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlUnits.cpp"/>
+        <source>the outermost element is "%1": LandXML was expected</source>
+        <translation>das äußerste Element ist „%1“: LandXML wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlUnits.cpp"/>
+        <source>the unit %1="%2" is not known</source>
+        <translation>die Einheit %1="%2" ist nicht bekannt</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/ParcelRows.cpp"/>
+        <source>the border of the parcel does not close: %1 metres are open</source>
+        <translation>die Grenze des Flurstücks schließt sich nicht: %1 Meter sind offen</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/PointRows.cpp"/>
+        <source>the name "%1" stands for several points</source>
+        <translation>der Name „%1“ steht für mehrere Punkte</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/PointRows.cpp"/>
+        <source>the file has several alignments: the name of one was expected</source>
+        <translation>die Datei hat mehrere Achsen: der Name von einer wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/PointRows.cpp"/>
+        <source>the alignment "%1" is not in the file</source>
+        <translation>die Achse „%1“ ist nicht in der Datei</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/PointRows.cpp"/>
+        <source>the alignment has no elements</source>
+        <translation>die Achse hat keine Elemente</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/PointRows.cpp"/>
+        <source>outside of a corner</source>
+        <translation>außen an einem Knick</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/PointRows.cpp"/>
+        <source>before the start</source>
+        <translation>vor dem Anfang</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/PointRows.cpp"/>
+        <source>after the end</source>
+        <translation>hinter dem Ende</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/PointRows.cpp"/>
+        <source>at a centre</source>
+        <translation>an einem Mittelpunkt</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/StationRows.cpp"/>
+        <source>the interval gives more than %1 stations</source>
+        <translation>der Abstand ergibt mehr als %1 Stationen</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/StationRows.cpp"/>
+        <source>the alignment has no station %1</source>
+        <translation>die Achse hat keine Station %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/StationRows.cpp"/>
+        <source>the alignment has the station %1 at several places</source>
+        <translation>die Achse hat die Station %1 an mehreren Stellen</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/XmlStream.cpp"/>
+        <source>the file declares the entity "%1": a file without entities was expected</source>
+        <translation>die Datei erklärt die Entität „%1“: eine Datei ohne Entitäten wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/XmlStream.cpp"/>
+        <source>the entity "%1" is not known</source>
+        <translation>die Entität „%1“ ist nicht bekannt</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/XmlStream.cpp"/>
+        <source>the tag has more than %1 bytes</source>
+        <translation>das Element hat in seiner Marke mehr als %1 Byte</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/XmlStream.cpp"/>
+        <source>the file is no well-formed XML: %1</source>
+        <translation>die Datei ist kein wohlgeformtes XML: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/XmlStream.cpp"/>
+        <source>the encoding of the file is not known: UTF-8, UTF-16, ISO-8859-1, US-ASCII or windows-1252 was expected</source>
+        <translation>die Zeichencodierung der Datei ist nicht bekannt: UTF-8, UTF-16, ISO-8859-1, US-ASCII oder windows-1252 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/XmlStream.cpp"/>
+        <source>the elements are nested more than %1 deep</source>
+        <translation>die Elemente sind tiefer als %1 ineinander geschachtelt</translation>
+    </message>
+    <message>
         <location filename="../jobs/JobData.cpp"/>
         <source>the data file "%1" cannot be read: %2</source>
         <translation>die Datendatei „%1“ kann nicht gelesen werden: %2</translation>

@@ -956,6 +956,291 @@
         <translation>行が %1 バイトを超えています: 行からなる表が必要です</translation>
     </message>
     <message>
+        <location filename="../sources/landxml/AlignmentRows.cpp"/>
+        <source>high point</source>
+        <translation>最高点</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/AlignmentRows.cpp"/>
+        <source>low point</source>
+        <translation>最低点</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the element has no geometry: a radius above zero was expected</source>
+        <translation>要素の形状を求められません: 0 より大きい半径が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the element has no geometry: a length above zero was expected</source>
+        <translation>要素の形状を求められません: 0 より大きい長さが必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the element winds round too often</source>
+        <translation>要素の周回数が多すぎます</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the element leaves its tangent by more than 45 degrees, which its form cannot</source>
+        <translation>要素が接線から 45 度を超えて離れており、この曲線形では表せません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the element is curved at both ends, which its form cannot be: a straight end was expected</source>
+        <translation>要素の両端が曲がっており、この曲線形では表せません: 一方の端は直線である必要があります</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the element has no geometry: %1 was expected</source>
+        <translation>要素の形状を求められません: %1 が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the point "%1" is not in the file</source>
+        <translation>点「%1」がファイルにありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the element has no geometry: its radius does not reach from its start to its end</source>
+        <translation>要素の形状を求められません: 半径が始点から終点まで届きません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>not supported: a transition of the form "%1"</source>
+        <translation>対応していません: 緩和曲線の形式「%1」</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>%1 is %2 in the file, but %3 by its geometry</source>
+        <translation>%1 はファイルでは %2 ですが、形状からは %3 です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>%1 is %2 beside the tangents of the element: perhaps the element bends to the other side</source>
+        <translation>%1 は要素の接線から %2 離れています: 要素は反対側に曲がっている可能性があります</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the grade line has fewer than two points</source>
+        <translation>計画縦断線の点が 2 点未満です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the grade line has no heights: a length or a radius above zero was expected</source>
+        <translation>計画縦断線の高さを求められません: 0 より大きい長さか半径が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the grade line has no heights: a station ahead of that of the point before was expected</source>
+        <translation>計画縦断線の高さを求められません: 測点は前の点より先である必要があります</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the first or the last point of the grade line has a curve, where only one grade meets</source>
+        <translation>計画縦断線の最初か最後の点に縦断曲線がありますが、そこには勾配が一つしかありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>the vertical curve begins before the curve of the point before has ended</source>
+        <translation>縦断曲線が前の点の曲線の終わりより手前で始まっています</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlList.cpp"/>
+        <source>the dictionary has none of the variables of this list, which are: %1</source>
+        <translation>辞書にこの一覧の変数が一つもありません。変数は次のとおりです: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlList.cpp"/>
+        <source>the value of the variable "%1" does not fit: %2 was expected</source>
+        <translation>変数「%1」の値が合いません: %2 が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlNotes.cpp"/>
+        <source>and %1 more such differences</source>
+        <translation>ほかに同様の相違が %1 件あります</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlNotes.cpp"/>
+        <source>%1: %2 in the file, which no list reads</source>
+        <translation>%1: ファイルに %2 個ありますが、どの一覧も読みません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlNotes.cpp"/>
+        <source>elements of other kinds: %1 in the file, which no list reads</source>
+        <translation>その他の種類の要素: ファイルに %1 個ありますが、どの一覧も読みません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReader.cpp"/>
+        <source>the element holds more than %1 bytes of text</source>
+        <translation>要素のテキストが %1 バイトを超えています</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReaderAttributes.cpp"/>
+        <source>the attribute %1 was expected</source>
+        <translation>属性 %1 が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReaderAttributes.cpp"/>
+        <source>the attribute %1="%2" does not fit: a number was expected</source>
+        <translation>属性 %1="%2" が合いません: 数値が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReaderAttributes.cpp"/>
+        <source>the attribute %1="%2" does not fit: an angle in the file's unit was expected</source>
+        <translation>属性 %1="%2" が合いません: ファイルの単位の角度が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReaderText.cpp"/>
+        <source>"%1" does not fit: a number was expected</source>
+        <translation>「%1」が合いません: 数値が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReaderText.cpp"/>
+        <source>signs stand apart from their numbers, to which they were taken to belong</source>
+        <translation>符号が数値から離れています。続く数値の符号とみなしました</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReaderText.cpp"/>
+        <source>the coordinates "%1" do not fit: northing, easting and perhaps a height were expected</source>
+        <translation>座標「%1」が合いません: 北距、東距、および必要なら標高が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReaderText.cpp"/>
+        <source>"%1" does not fit: two numbers were expected</source>
+        <translation>「%1」が合いません: 2 つの数値が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReaderText.cpp"/>
+        <source>the list of numbers ends within a point, which is passed over</source>
+        <translation>数値の並びが点の途中で終わっています。この点は読み飛ばします</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRoute.cpp"/>
+        <source>the element has no length and is passed over</source>
+        <translation>要素に長さがないため読み飛ばします</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRoute.cpp"/>
+        <source>the elements wind round too often</source>
+        <translation>要素の周回数の合計が多すぎます</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRoute.cpp"/>
+        <source>the station equation is not ahead of the start and of the equations before it, or has no numbers: staInternal or staBack, and staAhead were expected</source>
+        <translation>測点のブレーキが始点や前のブレーキより先にないか、数値がありません: staInternal または staBack と、staAhead が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRows.cpp"/>
+        <source>the file is of version %1: what is read are versions 1.0 to 2.0</source>
+        <translation>ファイルはバージョン %1 です: 読み取れるのはバージョン 1.0 から 2.0 です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlUnits.cpp"/>
+        <source>the file has no units: Metric or Imperial in Units was expected</source>
+        <translation>ファイルに単位がありません: Units の中に Metric または Imperial が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlUnits.cpp"/>
+        <source>the outermost element is "%1": LandXML was expected</source>
+        <translation>最も外側の要素が「%1」です: LandXML が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlUnits.cpp"/>
+        <source>the unit %1="%2" is not known</source>
+        <translation>単位 %1="%2" は不明です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/ParcelRows.cpp"/>
+        <source>the border of the parcel does not close: %1 metres are open</source>
+        <translation>区画の境界が閉じていません: %1 メートル開いています</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/PointRows.cpp"/>
+        <source>the name "%1" stands for several points</source>
+        <translation>名前「%1」の点が複数あります</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/PointRows.cpp"/>
+        <source>the file has several alignments: the name of one was expected</source>
+        <translation>ファイルに線形が複数あります: いずれかの名前が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/PointRows.cpp"/>
+        <source>the alignment "%1" is not in the file</source>
+        <translation>線形「%1」がファイルにありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/PointRows.cpp"/>
+        <source>the alignment has no elements</source>
+        <translation>線形に要素がありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/PointRows.cpp"/>
+        <source>outside of a corner</source>
+        <translation>折れ点の外側</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/PointRows.cpp"/>
+        <source>before the start</source>
+        <translation>始点より手前</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/PointRows.cpp"/>
+        <source>after the end</source>
+        <translation>終点より先</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/PointRows.cpp"/>
+        <source>at a centre</source>
+        <translation>中心点</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/StationRows.cpp"/>
+        <source>the interval gives more than %1 stations</source>
+        <translation>この間隔では測点が %1 を超えます</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/StationRows.cpp"/>
+        <source>the alignment has no station %1</source>
+        <translation>線形に測点 %1 がありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/StationRows.cpp"/>
+        <source>the alignment has the station %1 at several places</source>
+        <translation>線形の複数の箇所に測点 %1 があります</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/XmlStream.cpp"/>
+        <source>the file declares the entity "%1": a file without entities was expected</source>
+        <translation>ファイルが実体「%1」を宣言しています: 実体のないファイルが必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/XmlStream.cpp"/>
+        <source>the entity "%1" is not known</source>
+        <translation>実体「%1」は不明です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/XmlStream.cpp"/>
+        <source>the tag has more than %1 bytes</source>
+        <translation>タグが %1 バイトを超えています</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/XmlStream.cpp"/>
+        <source>the file is no well-formed XML: %1</source>
+        <translation>ファイルは整形式の XML ではありません: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/XmlStream.cpp"/>
+        <source>the encoding of the file is not known: UTF-8, UTF-16, ISO-8859-1, US-ASCII or windows-1252 was expected</source>
+        <translation>ファイルの文字コードが不明です: UTF-8、UTF-16、ISO-8859-1、US-ASCII、windows-1252 のいずれかが必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/XmlStream.cpp"/>
+        <source>the elements are nested more than %1 deep</source>
+        <translation>要素の入れ子が %1 段を超えています</translation>
+    </message>
+    <message>
         <location filename="../jobs/JobData.cpp"/>
         <source>the data file "%1" cannot be read: %2</source>
         <translation>データファイル「%1」を読み込めません: %2</translation>

@@ -36,6 +36,9 @@ TEST(Alignment, ADistanceIsAPlace)
     EXPECT_NEAR(alignment.at(120)->point.easting, 20, 1e-12);
     EXPECT_NEAR(alignment.at(100)->bearing, pi / 2, 1e-12) << "a border belongs to the element after it";
     EXPECT_NEAR(alignment.at(100, true)->bearing, 0, 1e-12) << "unless the element before it is asked for";
+    EXPECT_NEAR(alignment.at(100 - 1e-9)->bearing, pi / 2, 1e-12) << "what misses it by its last digits is on it";
+    EXPECT_NEAR(alignment.at(100 + 1e-9, true)->bearing, 0, 1e-12);
+    EXPECT_NEAR(alignment.at(100 - 1e-6)->bearing, 0, 1e-12);
     EXPECT_NEAR(alignment.at(0, true)->bearing, 0, 1e-12) << "there is none before the start";
     EXPECT_NEAR(alignment.at(150)->point.easting, 50, 1e-12);
     EXPECT_TRUE(alignment.at(-1e-8)) << "by its last digits";

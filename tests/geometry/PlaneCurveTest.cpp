@@ -125,6 +125,17 @@ TEST(PlaneCurve, ItsDirectionAndCurvatureAreTheRatesOfItsPoints)
     }
 }
 
+TEST(PlaneCurve, ItsEndIsAsStraightAsItIsSaidToBe)
+{
+    // The file's decimals, of which the product and the sum are rounded.
+    for (const TransitionForm form : {TransitionForm::Clothoid, TransitionForm::Bloss, TransitionForm::Sinusoid}) {
+        for (const double radius : {149.3, -77.7, 31.01}) {
+            EXPECT_EQ(curveOf(form, 37.503, 1 / radius, 0).end().curvature, 0) << static_cast<int>(form);
+            EXPECT_EQ(curveOf(form, 37.503, 1 / radius, -1 / 99.9).end().curvature, -1 / 99.9);
+        }
+    }
+}
+
 TEST(PlaneCurve, AllItsCurvaturesLieBetweenThoseOfAStretch)
 {
     for (const TransitionForm form : allForms) {

@@ -116,4 +116,48 @@ TEST(FileBytesPosix, APipeIsReadToItsEndHoweverMuchComes)
     }
 }
 
+/// Megabytes of files that are in this process's memory.
+double mappedMegabytes()
+{
+    QFile status(QStringLiteral("/proc/self/status"));
+    EXPECT_TRUE(status.open(QIODevice::ReadOnly));
+    for (const QByteArray &line : status.readAll().split('\n')) {
+        if (line.startsWith("RssFile:")) {
+            return line.mid(8).trimmed().split(' ').front().toDouble() / 1024;
+        }
+    }
+    return 0;
+}
+
+TEST(FileBytesPosix, WhatIsReleasedLeavesTheMemoryAndCanBeReadAgain)
+{
+    const JobFolder folder;
+    constexpr std::size_t block = std::size_t(1) << 16;
+    constexpr std::size_t size = 1000 * block;
+    folder.put("f", QByteArray("0123456789abcdef").repeated(size / 16));
+    const auto opened = FileBytes::open(folder.path("f"));
+    const auto &bytes = std::get<std::shared_ptr<const FileBytes>>(opened);
+    const double before = mappedMegabytes();
+    double most = 0;
+    for (std::size_t at = 0; at < size; at += block) {
+        EXPECT_EQ(std::count(bytes->view().begin() + std::ptrdiff_t(at),
+                             bytes->view().begin() + std::ptrdiff_t(at + block), 'a'),
+                  std::ptrdiff_t(block / 16));
+        bytes->release(at);
+        most = std::max(most, mappedMegabytes() - before);
+    }
+    EXPECT_LT(most, 12) << "of 62";
+    EXPECT_EQ(std::count(bytes->view().begin(), bytes->view().end(), 'f'), std::ptrdiff_t(size / 16)) << "read again";
+}
+
+TEST(FileBytesPosix, BytesInMemoryNeedNoFile)
+{
+    const auto bytes = FileBytes::holding(QStringLiteral("no such file"), "abc");
+    EXPECT_EQ(bytes->view(), "abc");
+    EXPECT_EQ(bytes->path(), QStringLiteral("no such file"));
+    EXPECT_FALSE(bytes->lostBytes());
+    bytes->release(3);
+    EXPECT_EQ(bytes->view(), "abc");
+}
+
 } // namespace

@@ -1,0 +1,30 @@
+#pragma once
+
+#include "FileBytes.h"
+#include "TextPlaces.h"
+
+#include <cstddef>
+
+namespace kareport
+{
+
+/// Finds the places of bytes of a text file, which may be in UTF-16 where it begins with a byte-order mark. Bytes that are
+/// asked for in turn cost one pass through the file, and the file is not in memory as a whole afterwards.
+class FilePlaces
+{
+public:
+    explicit FilePlaces(const FileBytes &file) : file_(file) {}
+
+    /// The place of a byte; after the end, that of the end.
+    TextPlace of(std::size_t byte);
+
+private:
+    void walk(std::size_t end);
+    void walkWide(std::size_t end, bool isLittle);
+
+    const FileBytes &file_;
+    std::size_t at_ = 0; ///< where the walk has come to
+    TextPlace place_;    ///< of that
+};
+
+} // namespace kareport

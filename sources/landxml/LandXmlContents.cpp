@@ -1,0 +1,89 @@
+#include "LandXmlContents.h"
+
+#include <unordered_map>
+
+namespace kareport
+{
+
+namespace
+{
+
+/// Where names stand in a list that has each once.
+class NamesOnce
+{
+public:
+    explicit NamesOnce(std::vector<LandXmlNamed> &names) : names_(names) {}
+
+    void add(const std::string &name, std::size_t count)
+    {
+        const auto [known, isNew] = indexes_.try_emplace(name, names_.size());
+        if (isNew) {
+            names_.push_back({QString::fromStdString(name), 0});
+        }
+        names_[known->second].count += count;
+    }
+
+private:
+    std::vector<LandXmlNamed> &names_;
+    std::unordered_map<std::string, std::size_t> indexes_;
+};
+
+void addAlignments(LandXmlContents &contents, const std::vector<LandXmlAlignment> &alignments)
+{
+    NamesOnce surfaceLines(contents.surfaceLines);
+    for (const LandXmlAlignment &alignment : alignments) {
+        contents.alignments.push_back({QString::fromStdString(alignment.name), alignment.elements.size()});
+        for (const LandXmlGradeLine &line : alignment.gradeLines) {
+            contents.gradeLines.push_back({QString::fromStdString(line.name), line.points.size()});
+        }
+        for (const LandXmlHeightLine &line : alignment.surfaceLines) {
+            surfaceLines.add(line.name, line.points.size());
+        }
+        for (const LandXmlSection &section : alignment.sections) {
+            for (const LandXmlSectionSurface &surface : section.surfaces) {
+                surfaceLines.add(surface.name, surface.points.size());
+            }
+        }
+    }
+}
+
+} // namespace
+
+Expected<LandXmlContents> readLandXmlContents(const std::shared_ptr<const FileBytes> &file,
+                                              const ReadProgress &progress)
+{
+    const auto header = readLandXmlHeader(file);
+    if (const InputError *error = errorOf(header)) {
+        return *error;
+    }
+    LandXmlContents contents;
+    contents.version = std::get<LandXmlHeader>(header).version;
+    LandXmlWants wants;
+    wants.points = wants.surfacePoints = wants.alignments = wants.surfaceLines = wants.sections = wants.parcels = true;
+    LandXmlNotes notes(file);
+    LandXmlReader reader(file, std::get<LandXmlHeader>(header).units, wants, notes);
+    std::vector<std::size_t> points;
+    for (bool isMore = true; isMore;) {
+        isMore = reader.readSome();
+        points.resize(reader.owners().size());
+        for (std::size_t i = 0; i < reader.pointCount(); ++i) {
+            ++points[reader.point(i).owner];
+        }
+        reader.dropPoints();
+        isMore = isMore && (!progress || progress(reader.position()));
+    }
+    if (reader.error()) {
+        return *reader.error();
+    }
+    for (std::size_t owner = 0; owner < points.size(); ++owner) {
+        auto &names = reader.isSurface(owner) ? contents.surfaces : contents.groups;
+        names.push_back({QString::fromStdString(reader.owners()[owner]), points[owner]});
+    }
+    addAlignments(contents, reader.alignments);
+    for (const LandXmlParcel &parcel : reader.parcels) {
+        contents.parcels.push_back({QString::fromStdString(parcel.name), parcel.elements.size()});
+    }
+    return contents;
+}
+
+} // namespace kareport

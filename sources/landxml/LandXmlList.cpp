@@ -1,0 +1,195 @@
+#include "LandXmlList.h"
+
+#include "EntryOrder.h"
+#include "Xlate.h"
+
+#include <algorithm>
+#include <numeric>
+
+namespace kareport
+{
+
+LandXmlList::LandXmlList(std::shared_ptr<const FileBytes> file, LandXmlQuery query, const FindVariable &findVariable,
+                         ReadProgress progress)
+    : file_(std::move(file)), progress_(std::move(progress))
+{
+    auto header = readLandXmlHeader(file_);
+    if (const InputError *error = errorOf(header)) {
+        error_ = endOfRows(*error);
+        return;
+    }
+    rows_ = LandXmlRows::make({file_, std::get<LandXmlHeader>(header), std::move(query), progress_});
+    bind(findVariable);
+}
+
+LandXmlList::~LandXmlList() = default;
+
+DataUnits LandXmlList::units()
+{
+    DataUnits units;
+    units.angle = AngleUnit::Radian;
+    return units;
+}
+
+std::vector<LandXmlVariable> LandXmlList::variables(const LandXmlQuery &query)
+{
+    // Which they are does not depend on the file.
+    const auto nothing = std::make_shared<FileBytes>();
+    return LandXmlRows::make({nothing, LandXmlHeader(), query, {}})->variables();
+}
+
+void LandXmlList::bind(const FindVariable &findVariable)
+{
+    QStringList known;
+    for (const LandXmlVariable &variable : rows_->variables()) {
+        if (const auto parser = findVariable(variable.name)) {
+            columns_.push_back({*parser, names_.size()});
+        }
+        names_.push_back(variable.name);
+        known.append(variable.name);
+    }
+    if (columns_.empty()) {
+        error_ = InputError{file_->path(), std::nullopt,
+                            Xlate("the dictionary has none of the variables of this list, which are: %1")
+                                .arg(known.join(QStringLiteral(", ")))};
+    }
+}
+
+UDataObject *LandXmlList::GetAt(std::size_t index)
+{
+    if (stopped_ || (error_ && batch_ == nullptr)) {
+        return nullptr;
+    }
+    if (batch_ == nullptr || index < batchStart_) {
+        static const RowBatch nothing;
+        rewind();
+        batch_ = &nothing;
+        batches_ = std::make_unique<RowBatches>([this](RowBatch &batch) { fill(batch); });
+    }
+    while (index - batchStart_ >= batch_->count) {
+        if (!takeBatch()) {
+            return nullptr;
+        }
+    }
+    return const_cast<UDataObject *>(&batch_->objects[index - batchStart_]);
+}
+
+/// Goes back to the first row, with no batch read.
+void LandXmlList::rewind()
+{
+    batches_.reset();
+    rows_->rewind();
+    nextOrdered_ = 0;
+    error_.reset();
+    batch_ = nullptr;
+    batchStart_ = 0;
+}
+
+/// Why the rows end where they do. What was cut off the file while it was read shows as rows that are wrong.
+std::optional<InputError> LandXmlList::endOfRows(const std::optional<InputError> &error) const
+{
+    const auto lost = file_->lostBytes();
+    return lost ? lost : error;
+}
+
+bool LandXmlList::takeBatch()
+{
+    if (batch_->isLast) {
+        error_ = endOfRows(batch_->error);
+        return false;
+    }
+    batchStart_ += batch_->count;
+    batch_ = &batches_->next();
+    stopped_ = rows_->isStopped() || (progress_ && !progress_(batch_->position));
+    return !stopped_;
+}
+
+void LandXmlList::fill(RowBatch &batch)
+{
+    batch.error.reset();
+    batch.isLast = false;
+    while (batch.count < RowBatch::most && !batch.isLast) {
+        batch.isLast = !readRow(batch);
+    }
+    batch.position = rows_->position();
+}
+
+bool LandXmlList::readRow(RowBatch &batch)
+{
+    if (order_) {
+        if (nextOrdered_ == order_->size()) {
+            return false;
+        }
+        rows_->goTo((*order_)[nextOrdered_++]);
+    } else if (!rows_->next()) {
+        batch.error = rows_->error();
+        return false;
+    }
+    batch.error = storeValues(batch.next(), nullptr);
+    batch.count += batch.error ? 0U : 1U;
+    return !batch.error;
+}
+
+/// Stores the values of the row at hand. @return what is wrong with one
+std::optional<InputError> LandXmlList::storeValues(UDataObject &object, const std::vector<unsigned> *onlyIds) const
+{
+    // The object may hold the values of an earlier row; two variables may have one identifier.
+    for (const Column &column : columns_) {
+        object.Remove(column.parser.id());
+    }
+    for (const Column &column : columns_) {
+        const ValueParser &parser = column.parser;
+        if (onlyIds != nullptr && std::find(onlyIds->begin(), onlyIds->end(), parser.id()) == onlyIds->end()) {
+            continue;
+        }
+        const LandXmlValue value = rows_->value(column.variable);
+        bool fits = true;
+        if (const auto *number = std::get_if<double>(&value)) {
+            fits = parser.storeNumber(*number, object);
+        } else if (const auto *text = std::get_if<std::string_view>(&value)) {
+            fits = parser.store(*text, object);
+        }
+        if (!fits) {
+            return InputError{file_->path(), FilePlaces(*file_).of(rows_->byte()),
+                              Xlate("the value of the variable \"%1\" does not fit: %2 was expected")
+                                  .arg(names_[column.variable], parser.expected())};
+        }
+    }
+    return std::nullopt;
+}
+
+void LandXmlList::Sort(const std::vector<unsigned> &ids)
+{
+    if (error_) {
+        return;
+    }
+    order_.reset();
+    rewind();
+    rows_->keep();
+    std::vector<UDataObject> keys;
+    while (rows_->next()) {
+        if (progress_ && keys.size() % RowBatch::most == 0 && !progress_(rows_->position())) {
+            stopped_ = true;
+            return;
+        }
+        if (const auto wrong = storeValues(keys.emplace_back(), &ids)) {
+            error_ = endOfRows(wrong);
+            return;
+        }
+    }
+    stopped_ = rows_->isStopped();
+    error_ = endOfRows(rows_->error());
+    std::vector<std::size_t> order(keys.size());
+    std::iota(order.begin(), order.end(), std::size_t(0));
+    std::stable_sort(order.begin(), order.end(), [&](std::size_t left, std::size_t right) {
+        return compareObjects(keys[left], keys[right], ids) < 0;
+    });
+    order_ = std::move(order);
+}
+
+std::vector<InputError> LandXmlList::notes() const
+{
+    return rows_ ? rows_->notes() : std::vector<InputError>();
+}
+
+} // namespace kareport

@@ -1,0 +1,72 @@
+#pragma once
+
+#include "DataUnits.h"
+#include "LandXmlQuery.h"
+#include "LandXmlRows.h"
+#include "RowBatches.h"
+#include "RowList.h"
+#include "ValueParser.h"
+
+#include <memory>
+#include <optional>
+#include <vector>
+
+namespace kareport
+{
+
+/// The rows of a LandXML file as data objects, made while they are asked for in turn: only a few objects exist at a time,
+/// and of points not even the file. Progress is told in bytes.
+class LandXmlList : public RowList
+{
+public:
+    /// Reads the file up to its units. Variables that the dictionary does not know are passed over.
+    /// @param findVariable  gives parsers for the units of `units()`
+    LandXmlList(std::shared_ptr<const FileBytes> file, LandXmlQuery query, const FindVariable &findVariable,
+                ReadProgress progress);
+    ~LandXmlList() override;
+
+    /// What the values are in, whatever the file's units are: metre, square metre, radian.
+    static DataUnits units();
+    /// The variables that the rows of a query have, with the value types that suit them.
+    static std::vector<LandXmlVariable> variables(const LandXmlQuery &query);
+
+    /// Going back is possible; points are then read from the file's start again.
+    UDataObject *GetAt(std::size_t index) override;
+    /// Makes the sort keys of all rows and orders the rows. Points are then kept in memory.
+    void Sort(const std::vector<unsigned> &ids) override;
+
+    std::optional<InputError> error() const override { return error_; }
+    /// What there is to say of a file whose rows are sound: what differs, and the kinds of elements that no list reads.
+    /// Complete when the rows have come to their end.
+    std::vector<InputError> notes() const;
+
+private:
+    struct Column
+    {
+        ValueParser parser;
+        std::size_t variable;
+    };
+
+    void bind(const FindVariable &findVariable);
+    void rewind();
+    bool takeBatch();
+    void fill(RowBatch &batch);
+    bool readRow(RowBatch &batch);
+    std::optional<InputError> storeValues(UDataObject &object, const std::vector<unsigned> *onlyIds) const;
+    std::optional<InputError> endOfRows(const std::optional<InputError> &error) const;
+
+    std::shared_ptr<const FileBytes> file_;
+    ReadProgress progress_;
+    std::unique_ptr<LandXmlRows> rows_; ///< null when the file could not be begun
+    std::vector<QString> names_;        ///< of the variables
+    std::vector<Column> columns_;
+    std::optional<std::vector<std::size_t>> order_; ///< of a sorted list
+    std::size_t nextOrdered_ = 0;
+    const RowBatch *batch_ = nullptr;
+    std::size_t batchStart_ = 0;
+    std::optional<InputError> error_;
+    bool stopped_ = false;
+    std::unique_ptr<RowBatches> batches_; ///< last, so that its thread ends before what it reads goes
+};
+
+} // namespace kareport

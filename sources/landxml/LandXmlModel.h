@@ -1,0 +1,172 @@
+#pragma once
+
+#include "PlanePoint.h"
+
+#include <cstddef>
+#include <limits>
+#include <optional>
+#include <string>
+#include <utility>
+#include <vector>
+
+namespace kareport
+{
+
+/// A number that a file does not say.
+inline constexpr double notGiven = std::numeric_limits<double>::quiet_NaN();
+
+// What a LandXML file holds, as it is stored. Lengths are in metres, areas in square metres, angles and directions in
+// radians. Texts are in UTF-8. `byte` is where the element stands in the file.
+
+/// Coordinates, or the name of the point that has them.
+struct LandXmlCoordinates
+{
+    std::optional<PlanePoint> position;
+    double height = notGiven;
+    std::string reference; ///< name of a point
+    std::string name;
+    std::size_t byte = 0;
+
+    bool isGiven() const { return position.has_value() || !reference.empty(); }
+};
+
+/// A point of a list of points or of a surface.
+struct LandXmlPoint
+{
+    std::string name;
+    std::string id; ///< by which others may refer to it as well
+    std::string code;
+    std::string description;
+    std::size_t owner = 0; ///< of its group or its surface, the index among the names that the reader has met
+    LandXmlCoordinates at;
+};
+
+/// A line, a curve or a transition of an alignment or of a parcel's border.
+struct LandXmlElement
+{
+    enum class Kind
+    {
+        Line,
+        IrregularLine,
+        Curve,
+        Spiral
+    };
+
+    Kind kind = Kind::Line;
+    std::string name;
+    std::string form;     ///< of a spiral
+    std::string rotation; ///< "cw", "ccw" or nothing
+    double length = notGiven;
+    double radius = notGiven;
+    double radiusStart = notGiven; ///< of a spiral; may be infinite
+    double radiusEnd = notGiven;
+    double staStart = notGiven;
+    double direction = notGiven; ///< at the start, as it is written
+    double directionEnd = notGiven;
+    double delta = notGiven;
+    LandXmlCoordinates start, end, centre, intersection;
+    std::vector<LandXmlCoordinates> between; ///< of an irregular line, points between start and end
+    std::size_t byte = 0;
+};
+
+struct LandXmlEquation
+{
+    double internal = notGiven;
+    double back = notGiven;
+    double ahead = notGiven;
+    bool isDecreasing = false;
+    std::size_t byte = 0;
+};
+
+/// A point of a grade line with the measures of its curve.
+struct LandXmlGradePoint
+{
+    enum class Kind
+    {
+        Point,
+        Parabola,
+        UnsymmetricParabola,
+        Circle
+    };
+
+    Kind kind = Kind::Point;
+    double station = notGiven;
+    double height = notGiven;
+    double length = notGiven;
+    double lengthIn = notGiven;
+    double lengthOut = notGiven;
+    double radius = notGiven;
+    std::size_t byte = 0;
+};
+
+struct LandXmlGradeLine
+{
+    std::string name;
+    std::vector<LandXmlGradePoint> points;
+    std::size_t byte = 0;
+};
+
+/// Heights along an alignment, or across it: stations or offsets, each with its height.
+struct LandXmlHeightLine
+{
+    std::string name;
+    std::vector<std::pair<double, double>> points;
+    std::size_t byte = 0;
+};
+
+struct LandXmlSectionPoint
+{
+    double offset;
+    double height;
+    std::string code;
+};
+
+/// A surface in a cross section.
+struct LandXmlSectionSurface
+{
+    std::string name;
+    std::string side;
+    std::string material;
+    bool isDesign = false;
+    double width = notGiven;
+    double thickness = notGiven;
+    std::vector<LandXmlSectionPoint> points;
+    std::size_t byte = 0;
+};
+
+struct LandXmlSection
+{
+    std::string name;
+    double station = notGiven;
+    double cutArea = notGiven;
+    double fillArea = notGiven;
+    std::vector<LandXmlSectionSurface> surfaces;
+    std::size_t byte = 0;
+};
+
+struct LandXmlAlignment
+{
+    std::string name;
+    std::string description;
+    double staStart = 0;
+    double length = notGiven;
+    std::vector<LandXmlEquation> equations;
+    std::vector<LandXmlElement> elements;
+    std::vector<LandXmlGradeLine> gradeLines;
+    std::vector<LandXmlHeightLine> surfaceLines;
+    std::vector<LandXmlSection> sections;
+    std::size_t byte = 0;
+};
+
+struct LandXmlParcel
+{
+    std::string name;
+    std::string description;
+    std::string owner; ///< the parcel that it is a part of
+    double area = notGiven;
+    std::vector<LandXmlElement> elements;
+    LandXmlCoordinates centre;
+    std::size_t byte = 0;
+};
+
+} // namespace kareport

@@ -1,0 +1,64 @@
+#include "LandXmlNotes.h"
+
+#include "Xlate.h"
+#include "XmlStream.h"
+
+#include <algorithm>
+
+namespace kareport
+{
+
+void LandXmlNotes::add(std::size_t byte, const QString &text)
+{
+    if (placed_.size() == most) {
+        ++more_;
+        return;
+    }
+    placed_.push_back({byte, text});
+}
+
+void LandXmlNotes::passOver(std::string_view element)
+{
+    const auto known = passedOver_.find(element);
+    if (known != passedOver_.end()) {
+        ++known->second;
+    } else if (passedOver_.size() < most) {
+        passedOver_.emplace(element.substr(0, 100), 1);
+    } else {
+        ++otherKinds_;
+    }
+}
+
+void LandXmlNotes::clear()
+{
+    placed_.clear();
+    more_ = 0;
+    passedOver_.clear();
+    otherKinds_ = 0;
+}
+
+std::vector<InputError> LandXmlNotes::all() const
+{
+    std::vector<Note> placed = placed_;
+    std::stable_sort(placed.begin(), placed.end(),
+                     [](const Note &left, const Note &right) { return left.byte < right.byte; });
+    std::vector<InputError> notes;
+    FilePlaces places(*file_);
+    for (const Note &note : placed) {
+        notes.push_back({file_->path(), places.of(note.byte), note.text});
+    }
+    const auto add = [&](const QString &text) { notes.push_back({file_->path(), std::nullopt, text}); };
+    if (more_ > 0) {
+        add(Xlate("and %1 more such differences").arg(more_));
+    }
+    for (const auto &[element, count] : passedOver_) {
+        add(Xlate("%1: %2 in the file, which no list reads")
+                .arg(QString::fromStdString(element), QString::number(count)));
+    }
+    if (otherKinds_ > 0) {
+        add(Xlate("elements of other kinds: %1 in the file, which no list reads").arg(otherKinds_));
+    }
+    return notes;
+}
+
+} // namespace kareport

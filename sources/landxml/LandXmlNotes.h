@@ -1,0 +1,47 @@
+#pragma once
+
+#include "FileBytes.h"
+#include "InputError.h"
+
+#include <map>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace kareport
+{
+
+/// What a reader has to say of a file whose rows are sound: differences, and what is not read. Bounded, whatever the file
+/// holds.
+class LandXmlNotes
+{
+public:
+    static constexpr std::size_t most = 100; ///< notes with a place, and kinds of elements
+
+    explicit LandXmlNotes(std::shared_ptr<const FileBytes> file) : file_(std::move(file)) {}
+
+    void add(std::size_t byte, const QString &text);
+    /// Counts an element that no list reads.
+    void passOver(std::string_view element);
+    void clear();
+
+    /// All notes: first those with a place, in the order of the file, then the elements that were passed over, by their
+    /// names.
+    std::vector<InputError> all() const;
+
+private:
+    struct Note
+    {
+        std::size_t byte;
+        QString text;
+    };
+
+    std::shared_ptr<const FileBytes> file_;
+    std::vector<Note> placed_;
+    std::size_t more_ = 0;
+    std::map<std::string, std::size_t, std::less<>> passedOver_;
+    std::size_t otherKinds_ = 0;
+};
+
+} // namespace kareport

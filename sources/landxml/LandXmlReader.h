@@ -1,0 +1,116 @@
+#pragma once
+
+#include "LandXmlModel.h"
+#include "LandXmlNotes.h"
+#include "LandXmlUnits.h"
+#include "XmlStream.h"
+
+#include <functional>
+#include <string>
+#include <vector>
+
+namespace kareport
+{
+
+/// What is wanted of a file. What is not is walked past and takes neither time nor memory.
+struct LandXmlWants
+{
+    bool points = false;
+    bool surfacePoints = false;
+    bool alignments = false; ///< with their elements, equations and grade lines
+    bool surfaceLines = false;
+    bool sections = false;
+    bool parcels = false;
+};
+
+/// Reads a LandXML file in one pass. Alignments and parcels are kept; points are kept until they are taken, so that a file
+/// of many takes no memory.
+class LandXmlReader : private XmlHandler
+{
+public:
+    /// @param notes  is told what is odd; it must live as long as the reader
+    LandXmlReader(std::shared_ptr<const FileBytes> file, const LandXmlUnits &units, const LandXmlWants &wants,
+                  LandXmlNotes &notes);
+
+    /// Reads the next piece of the file. @return false at the end and when something is wrong
+    bool readSome() { return stream_.readSome(); }
+    const std::optional<InputError> &error() const { return stream_.error(); }
+    std::size_t position() const { return stream_.position(); }
+
+    /// Of the points that were read since they were dropped, as they stand in the file, the number and each.
+    std::size_t pointCount() const { return pointCount_; }
+    const LandXmlPoint &point(std::size_t index) const { return points_[index]; }
+    void dropPoints() { pointCount_ = 0; }
+    /// The names of groups and surfaces, by the points' owners.
+    const std::vector<std::string> &owners() const { return owners_; }
+    bool isSurface(std::size_t owner) const { return isSurface_[owner]; }
+
+    std::vector<LandXmlAlignment> alignments;
+    std::vector<LandXmlParcel> parcels;
+
+private:
+    enum class Tag : unsigned char;
+    struct Open
+    {
+        Tag tag;
+        bool isRead; ///< its text is taken at its end
+    };
+
+    Interest startElement(std::string_view name, const XmlAttributes &attributes) override;
+    void endElement() override;
+    void text(std::string_view piece) override;
+    void foreignElement(std::string_view name) override;
+
+    static Tag tagOf(Tag parent, std::string_view name);
+    static bool isHeader(std::string_view name);
+    Interest begin(Tag tag, const XmlAttributes &attributes);
+    Interest beginInAlignment(Tag tag, const XmlAttributes &attributes);
+    Interest beginInProfile(Tag tag, const XmlAttributes &attributes);
+    Interest beginInSections(Tag tag, const XmlAttributes &attributes);
+    bool isListRead() const;
+    void beginElement(Tag tag, const XmlAttributes &attributes);
+    void beginPoint(Tag tag, const XmlAttributes &attributes);
+    void beginEquation(const XmlAttributes &attributes);
+    void beginGradePoint(Tag tag, const XmlAttributes &attributes);
+    void beginSection(const XmlAttributes &attributes);
+    void beginSectionSurface(Tag tag, const XmlAttributes &attributes);
+    void beginAlignment(const XmlAttributes &attributes);
+    void beginParcel(const XmlAttributes &attributes);
+    void end(Tag tag);
+    void addPoint();
+    void endPointList(Tag tag);
+    LandXmlCoordinates &coordinatesOf(Tag tag);
+    LandXmlElement &element();
+
+    double number(const XmlAttributes &attributes, const char *name, double missing = notGiven);
+    double length(const XmlAttributes &attributes, const char *name)
+    {
+        return number(attributes, name) * units_.metres;
+    }
+    double angle(const XmlAttributes &attributes, const char *name, LandXmlAngle form);
+    void startCoordinates(LandXmlCoordinates &at, const XmlAttributes &attributes);
+    void takeCoordinates(LandXmlCoordinates &at);
+    bool takeNumbers();
+    void takePair(double &first, double &second);
+    static std::string textOf(const XmlAttributes &attributes, const char *name);
+    /// A text of the file for a message, cut short.
+    static QString quoteOf(std::string_view text);
+
+    XmlStream stream_;
+    LandXmlUnits units_;
+    LandXmlWants wants_;
+    LandXmlNotes &notes_;
+    std::vector<Open> open_;
+    std::string text_;
+    std::size_t textByte_ = 0;
+    std::vector<double> numbers_;
+    LandXmlPoint point_;               ///< that is read; the file's next piece may be needed for its end
+    std::vector<LandXmlPoint> points_; ///< more than are in use, for their texts' memory
+    std::size_t pointCount_ = 0;
+    std::vector<std::string> owners_;
+    std::vector<bool> isSurface_;         ///< of the owners
+    int parcelDepth_ = 0;                 ///< parcels that are open
+    std::vector<std::size_t> parcelPath_; ///< their indexes, the innermost last, where they are wanted
+};
+
+} // namespace kareport

@@ -1,0 +1,51 @@
+#pragma once
+
+#include "LandXmlGeometry.h"
+
+#include <optional>
+#include <variant>
+#include <vector>
+
+namespace kareport
+{
+
+/// The geometry of a stored alignment.
+struct LandXmlRoute
+{
+    /// An element of the alignment along it.
+    struct Piece
+    {
+        std::size_t element; ///< index among the stored ones
+        double start;        ///< distance from the alignment's start
+        double length;
+        std::vector<PlaneCurve> curves; ///< none where it has no geometry
+    };
+
+    const LandXmlAlignment *stored = nullptr;
+    std::vector<Piece> pieces; ///< elements of no length are left out
+    Alignment alignment;       ///< all curves, up to the first element without
+    double length = 0;
+    Stationing stationing{0};
+    std::vector<std::variant<LandXmlProfile, LandXmlFault>> profiles; ///< of the grade lines, in their order
+    std::optional<LandXmlFault> fault;                                ///< why there is no place along the whole of it
+
+    /// The station of a distance. @param back  the name that a place on an equation has before it
+    Stationing::Name nameOf(double distance, bool back = false) const
+    {
+        return stationing.nameOf(distance + stationing.start(), back);
+    }
+    /// The grade line of a name, or the first where it is empty; null when there is none, or it has no geometry.
+    const VerticalProfile *profile(const std::string &name) const;
+    /// The surface of a name along the alignment, or the first.
+    const LandXmlHeightLine *surface(const std::string &name) const;
+};
+
+/// The height on a line at a station, between its points; nothing outside.
+std::optional<double> heightOn(const LandXmlHeightLine &line, double station);
+
+/// Makes the geometry of alignments, and says in the notes what does not fit together. @return one for each, or why
+/// their geometry cannot be had. They refer to the alignments, which must live as long.
+std::variant<std::vector<LandXmlRoute>, LandXmlFault> routesOf(const std::vector<LandXmlAlignment> &alignments,
+                                                               const LandXmlGeometry &geometry, LandXmlNotes &notes);
+
+} // namespace kareport

@@ -1,0 +1,177 @@
+#include "LandXmlRows.h"
+
+#include "AlignmentRows.h"
+#include "ParcelRows.h"
+#include "PointRows.h"
+#include "SectionRows.h"
+#include "StationRows.h"
+#include "Xlate.h"
+
+#include <QStringList>
+
+#include <array>
+#include <utility>
+
+namespace kareport
+{
+
+namespace
+{
+
+using Kind = LandXmlListKind;
+
+constexpr std::array<std::pair<QStringView, Kind>, 10> keys = {{{u"points", Kind::Points},
+                                                                {u"surfacePoints", Kind::SurfacePoints},
+                                                                {u"parcels", Kind::Parcels},
+                                                                {u"courses", Kind::Courses},
+                                                                {u"alignments", Kind::Alignments},
+                                                                {u"elements", Kind::Elements},
+                                                                {u"stations", Kind::Stations},
+                                                                {u"profile", Kind::Profile},
+                                                                {u"crossSections", Kind::CrossSections},
+                                                                {u"offsetsOf", Kind::OffsetsOf}}};
+
+} // namespace
+
+bool hasReferences(const std::vector<LandXmlElement> &elements)
+{
+    for (const LandXmlElement &element : elements) {
+        for (const auto *at : {&element.start, &element.end, &element.centre, &element.intersection}) {
+            if (!at->reference.empty() && !at->position) {
+                return true;
+            }
+        }
+    }
+    return false;
+}
+
+std::optional<LandXmlListKind> landXmlListFromKey(QStringView key)
+{
+    for (const auto &[known, kind] : keys) {
+        if (known == key) {
+            return kind;
+        }
+    }
+    return std::nullopt;
+}
+
+QStringView keyOf(LandXmlListKind kind)
+{
+    return keys[static_cast<std::size_t>(kind)].first;
+}
+
+std::unique_ptr<LandXmlRows> LandXmlRows::make(LandXmlSource source)
+{
+    switch (source.query.kind) {
+    case Kind::Points:
+    case Kind::SurfacePoints: return std::make_unique<PointRows>(std::move(source));
+    case Kind::OffsetsOf: return std::make_unique<ProjectedRows>(std::move(source));
+    case Kind::Parcels: return std::make_unique<ParcelRows>(std::move(source));
+    case Kind::Courses: return std::make_unique<CourseRows>(std::move(source));
+    case Kind::Alignments: return std::make_unique<AlignmentRows>(std::move(source));
+    case Kind::Elements: return std::make_unique<ElementRows>(std::move(source));
+    case Kind::Stations: return std::make_unique<StationRows>(std::move(source));
+    case Kind::Profile: return std::make_unique<ProfileRows>(std::move(source));
+    case Kind::CrossSections: break;
+    }
+    return std::make_unique<SectionRows>(std::move(source));
+}
+
+LandXmlRows::LandXmlRows(LandXmlSource source)
+    : source_(std::move(source)), modelNotes_(source_.file), passNotes_(source_.file)
+{
+    const QString &version = source_.header.version;
+    const QStringList known = {QString(), QStringLiteral("1.0"), QStringLiteral("1.1"), QStringLiteral("1.2"),
+                               QStringLiteral("2.0")};
+    if (!known.contains(version)) {
+        modelNotes_.add(0, Xlate("the file is of version %1: what is read are versions 1.0 to 2.0").arg(version));
+    }
+}
+
+void LandXmlRows::fail(std::size_t byte, const QString &text)
+{
+    if (!error_) {
+        error_ = InputError{source_.file->path(), FilePlaces(*source_.file).of(byte), text};
+    }
+}
+
+const LandXmlPointTable *LandXmlRows::pointTable()
+{
+    if (!pointTable_) {
+        auto table = std::make_unique<LandXmlPointTable>();
+        LandXmlNotes unheard(source_.file); // what is odd is said by the pass that makes the rows
+        LandXmlWants wants;
+        wants.points = true;
+        LandXmlReader reader(source_.file, source_.header.units, wants, unheard);
+        for (bool isMore = true; isMore;) {
+            isMore = reader.readSome();
+            for (std::size_t i = 0; i < reader.pointCount(); ++i) {
+                table->add(reader.point(i));
+            }
+            reader.dropPoints();
+        }
+        if (reader.error()) {
+            error_ = reader.error();
+            return nullptr;
+        }
+        pointTable_ = std::move(table);
+    }
+    return pointTable_.get();
+}
+
+std::unique_ptr<LandXmlReader> LandXmlRows::readAll(const LandXmlWants &wants)
+{
+    auto reader = std::make_unique<LandXmlReader>(source_.file, source_.header.units, wants, modelNotes_);
+    while (reader->readSome()) {
+        position_ = reader->position();
+        if (source_.progress && !source_.progress(position_)) {
+            isStopped_ = true;
+            return nullptr;
+        }
+    }
+    position_ = reader->position();
+    error_ = reader->error();
+    return error_ ? nullptr : std::move(reader);
+}
+
+bool LandXmlRows::readAlignments(AlignmentModel &model, LandXmlWants wants)
+{
+    wants.alignments = true;
+    const auto reader = readAll(wants);
+    if (!reader) {
+        return false;
+    }
+    model.alignments = std::move(reader->alignments);
+    bool refers = false;
+    for (const LandXmlAlignment &alignment : model.alignments) {
+        refers = refers || hasReferences(alignment.elements);
+    }
+    const LandXmlPointTable *points = refers ? pointTable() : nullptr;
+    if (refers && points == nullptr) {
+        return false;
+    }
+    const LandXmlGeometry geometry(source_.header.units, source_.query.tolerance, points, &modelNotes_);
+    auto routes = routesOf(model.alignments, geometry, modelNotes_);
+    if (const auto *fault = std::get_if<LandXmlFault>(&routes)) {
+        fail(*fault);
+        return false;
+    }
+    model.routes = std::move(std::get<std::vector<LandXmlRoute>>(routes));
+    return true;
+}
+
+bool LandXmlRows::isNamed(const std::string &name) const
+{
+    return source_.query.name.isEmpty() || source_.query.name == QString::fromStdString(name);
+}
+
+std::vector<InputError> LandXmlRows::notes() const
+{
+    std::vector<InputError> all = modelNotes_.all();
+    for (InputError &note : passNotes_.all()) {
+        all.push_back(std::move(note));
+    }
+    return all;
+}
+
+} // namespace kareport

@@ -1,0 +1,132 @@
+#pragma once
+
+#include "LandXmlNotes.h"
+#include "LandXmlQuery.h"
+#include "LandXmlReader.h"
+#include "LandXmlRoute.h"
+#include "LandXmlUnits.h"
+#include "RowList.h"
+
+#include <QString>
+
+#include <cmath>
+#include <memory>
+#include <optional>
+#include <string>
+#include <string_view>
+#include <variant>
+#include <vector>
+
+namespace kareport
+{
+
+/// A value of a row: none, a number in metres, square metres or radians, or a text in UTF-8.
+using LandXmlValue = std::variant<std::monostate, double, std::string_view>;
+
+/// A number that may be missing.
+inline LandXmlValue valueOf(double number)
+{
+    return std::isnan(number) ? LandXmlValue() : LandXmlValue(number);
+}
+inline LandXmlValue valueOf(const std::optional<double> &number)
+{
+    return number ? LandXmlValue(*number) : LandXmlValue();
+}
+inline LandXmlValue valueOf(const std::string &text)
+{
+    return text.empty() ? LandXmlValue() : LandXmlValue(std::string_view(text));
+}
+
+/// A variable that rows have.
+struct LandXmlVariable
+{
+    QString name;
+    int type; ///< the value type that suits it
+};
+
+/// A variable of rows of one class, and how it is had.
+template <typename Rows>
+struct LandXmlGetter
+{
+    const char *name;
+    int type;
+    LandXmlValue (*get)(const Rows &rows);
+};
+
+/// What rows are made from.
+struct LandXmlSource
+{
+    std::shared_ptr<const FileBytes> file;
+    LandXmlHeader header;
+    LandXmlQuery query;
+    /// Is told how many bytes have been read while more than a batch of rows is read at once. @return false to stop
+    ReadProgress progress;
+};
+
+/// Whether coordinates of elements refer to points.
+bool hasReferences(const std::vector<LandXmlElement> &elements);
+
+/// The alignments of a file with their geometry.
+struct AlignmentModel
+{
+    std::vector<LandXmlAlignment> alignments;
+    std::vector<LandXmlRoute> routes; ///< one for each
+};
+
+/// Rows of a file, made one at a time.
+class LandXmlRows
+{
+public:
+    explicit LandXmlRows(LandXmlSource source);
+    virtual ~LandXmlRows() = default;
+    LandXmlRows(const LandXmlRows &) = delete;
+    LandXmlRows &operator=(const LandXmlRows &) = delete;
+
+    static std::unique_ptr<LandXmlRows> make(LandXmlSource source);
+
+    virtual std::vector<LandXmlVariable> variables() const = 0;
+    /// Goes on to the next row. @return false after the last one, and when something is wrong
+    virtual bool next() = 0;
+    /// Goes back before the first row.
+    virtual void rewind() = 0;
+    /// Keeps all rows that are gone through from now on, for `goTo`.
+    virtual void keep() {}
+    /// Goes to a row by its number from 0, after all were gone through.
+    virtual void goTo(std::size_t index) = 0;
+
+    /// A value of the row at hand, valid until the next one.
+    virtual LandXmlValue value(std::size_t variable) const = 0;
+    /// Where the row at hand comes from.
+    virtual std::size_t byte() const = 0;
+    /// Bytes of the file that were read.
+    std::size_t position() const { return position_; }
+    const std::optional<InputError> &error() const { return error_; }
+    /// Whether the progress has stopped the reading.
+    bool isStopped() const { return isStopped_; }
+    /// What there is to say of the file, complete after the last row.
+    std::vector<InputError> notes() const;
+
+protected:
+    void fail(std::size_t byte, const QString &text);
+    void fail(const LandXmlFault &fault) { fail(fault.byte, fault.text); }
+    /// The points of the file by their names, read at the first call; null when that fails.
+    const LandXmlPointTable *pointTable();
+    /// Reads the whole file. @return what was read, or null when something is wrong or the progress has stopped it
+    std::unique_ptr<LandXmlReader> readAll(const LandXmlWants &wants);
+    /// Reads the alignments, and makes their geometry. @return whether that went well
+    bool readAlignments(AlignmentModel &model, LandXmlWants wants);
+    /// Whether the query asks for something of a name, or for all.
+    bool isNamed(const std::string &name) const;
+
+    LandXmlSource source_;
+    LandXmlNotes modelNotes_; ///< of what is read once
+    LandXmlNotes passNotes_;  ///< of the pass at hand, where rows are made while the file is read
+    std::size_t position_ = 0;
+    std::optional<InputError> error_;
+    bool isStopped_ = false;
+
+private:
+    std::unique_ptr<LandXmlPointTable> pointTable_;
+};
+
+} // namespace kareport

@@ -1,0 +1,242 @@
+#include "LandXmlUnits.h"
+
+#include "UnitFactors.h"
+#include "ValueParser.h"
+#include "Xlate.h"
+
+#include <cmath>
+#include <numbers>
+#include <string>
+
+namespace kareport
+{
+
+namespace
+{
+
+/// Lower case, with runs of blanks as one and none around: programs differ in both.
+std::string folded(std::string_view text)
+{
+    std::string result;
+    for (const char character : text) {
+        if (character == ' ' || character == '\t' || character == '\n' || character == '\r') {
+            if (!result.empty() && result.back() != ' ') {
+                result += ' ';
+            }
+        } else {
+            result += character >= 'A' && character <= 'Z' ? static_cast<char>(character + 32) : character;
+        }
+    }
+    while (!result.empty() && result.back() == ' ') {
+        result.pop_back();
+    }
+    return result;
+}
+
+struct Unit
+{
+    std::string_view name;
+    double size;
+};
+
+constexpr double usFoot = 1200.0 / 3937.0;
+constexpr Unit lengths[] = {
+    {"meter", 1},       {"metre", 1},       {"millimeter", 0.001},    {"centimeter", 0.01},       {"kilometer", 1000},
+    {"foot", 0.3048},   {"feet", 0.3048},   {"ussurveyfoot", usFoot}, {"us survey foot", usFoot}, {"inch", 0.0254},
+    {"mile", 1609.344}, {"miles", 1609.344}};
+constexpr Unit areas[] = {{"squaremeter", 1},
+                          {"squaremetre", 1},
+                          {"squaremillimeter", 1e-6},
+                          {"squarecentimeter", 1e-4},
+                          {"hectare", 1e4},
+                          {"squarefoot", 0.3048 * 0.3048},
+                          {"squareinch", 0.0254 * 0.0254},
+                          {"acre", 43560 * 0.3048 * 0.3048},
+                          {"squaremiles", 1609.344 * 1609.344}};
+
+struct AngleName
+{
+    std::string_view name;
+    LandXmlAngle form;
+};
+
+constexpr AngleName angleNames[] = {{"radians", LandXmlAngle::Radians},
+                                    {"grads", LandXmlAngle::Grads},
+                                    {"decimal degrees", LandXmlAngle::Degrees},
+                                    {"decimal dd.mm.ss", LandXmlAngle::DegreesMinutesSeconds}};
+
+/// Reads up to the end of the units.
+class HeaderReader : public XmlHandler
+{
+public:
+    explicit HeaderReader(const std::shared_ptr<const FileBytes> &file) : stream_(file, *this) {}
+
+    Expected<LandXmlHeader> read(const QString &path)
+    {
+        while (stream_.readSome()) {
+        }
+        if (stream_.error()) {
+            return *stream_.error();
+        }
+        if (!hasUnits_) {
+            return InputError{path, std::nullopt,
+                              Xlate("the file has no units: Metric or Imperial in Units was expected")};
+        }
+        return header_;
+    }
+
+    Interest startElement(std::string_view name, const XmlAttributes &attributes) override
+    {
+        ++depth_;
+        if (depth_ == 1) {
+            header_.version = textOf(attributes.text("version"));
+            if (name != "LandXML") {
+                stream_.fail(stream_.currentByte(),
+                             Xlate("the outermost element is \"%1\": LandXML was expected").arg(textOf(name)));
+            }
+            return Interest::Parts;
+        }
+        if (depth_ == 2 && name == "Units") {
+            return Interest::Parts;
+        }
+        if (depth_ == 3 && (name == "Metric" || name == "Imperial")) {
+            takeUnits(attributes);
+        }
+        --depth_;
+        return Interest::None;
+    }
+    void endElement() override { --depth_; }
+    void text(std::string_view) override {}
+    void foreignElement(std::string_view) override {}
+
+private:
+    static QString textOf(std::string_view text)
+    {
+        return QString::fromUtf8(text.data(), static_cast<qsizetype>(std::min<std::size_t>(text.size(), 200)));
+    }
+
+    void failUnit(const char *attribute, std::string_view value)
+    {
+        stream_.fail(stream_.currentByte(),
+                     Xlate("the unit %1=\"%2\" is not known").arg(QString::fromUtf8(attribute), textOf(value)));
+    }
+
+    template <typename Units>
+    void takeSize(const XmlAttributes &attributes, const char *attribute, const Units &units, double &size)
+    {
+        const std::string name = folded(attributes.text(attribute));
+        for (const Unit &unit : units) {
+            if (unit.name == name) {
+                size = unit.size;
+                return;
+            }
+        }
+        failUnit(attribute, attributes.text(attribute));
+    }
+
+    void takeAngle(const XmlAttributes &attributes, const char *attribute, LandXmlAngle &form)
+    {
+        const auto value = attributes.find(attribute);
+        if (!value) {
+            return; // radians, as the format has it
+        }
+        const std::string name = folded(*value);
+        for (const AngleName &known : angleNames) {
+            if (known.name == name) {
+                form = known.form;
+                return;
+            }
+        }
+        failUnit(attribute, *value);
+    }
+
+    void takeUnits(const XmlAttributes &attributes)
+    {
+        LandXmlUnits &units = header_.units;
+        takeSize(attributes, "linearUnit", lengths, units.metres);
+        units.squareMetres = units.metres * units.metres;
+        if (attributes.find("areaUnit")) {
+            takeSize(attributes, "areaUnit", areas, units.squareMetres);
+        }
+        // An acre or a square foot is of the same foot as the lengths.
+        const std::string area = folded(attributes.text("areaUnit"));
+        if (units.metres == usFoot && (area == "acre" || area == "squarefoot")) {
+            units.squareMetres *= (usFoot / 0.3048) * (usFoot / 0.3048);
+        }
+        takeAngle(attributes, "angularUnit", units.angle);
+        takeAngle(attributes, "directionUnit", units.direction);
+        hasUnits_ = true;
+        if (!stream_.error()) {
+            stream_.stop();
+        }
+    }
+
+    XmlStream stream_;
+    LandXmlHeader header_;
+    int depth_ = 0;
+    bool hasUnits_ = false;
+};
+
+/// Two digits of a fraction, as a number. Missing ones are zeros.
+double twoDigits(std::string_view fraction, std::size_t at)
+{
+    const auto digit = [&](std::size_t place) { return place < fraction.size() ? fraction[place] - '0' : 0; };
+    return 10 * digit(at) + digit(at + 1);
+}
+
+/// 45.30155 is 45 degrees, 30 minutes and 15.5 seconds; so is 45.30.155.
+bool parseDegreesMinutesSeconds(std::string_view text, double &degrees)
+{
+    const bool isNegative = !text.empty() && text.front() == '-';
+    if (!text.empty() && (isNegative || text.front() == '+')) {
+        text.remove_prefix(1);
+    }
+    const std::size_t point = std::min(text.find('.'), text.size());
+    const std::string_view whole = text.substr(0, point);
+    std::string fraction(text.substr(std::min(point + 1, text.size())));
+    if (fraction.size() > 2 && fraction[2] == '.') {
+        fraction.erase(2, 1);
+    }
+    const auto isDigits = [](std::string_view digits) {
+        return digits.find_first_not_of("0123456789") == std::string_view::npos;
+    };
+    double number = 0;
+    if (whole.empty() || !isDigits(whole) || !isDigits(fraction) || !parseNumber(whole, number)) {
+        return false;
+    }
+    const double minutes = twoDigits(fraction, 0);
+    double seconds = twoDigits(fraction, 2);
+    if (fraction.size() > 4) {
+        double rest = 0;
+        parseNumber("0." + fraction.substr(4), rest);
+        seconds += rest;
+    }
+    if (minutes >= 60 || seconds >= 60) {
+        return false;
+    }
+    degrees = (number + minutes / 60 + seconds / 3600) * (isNegative ? -1 : 1);
+    return true;
+}
+
+} // namespace
+
+Expected<LandXmlHeader> readLandXmlHeader(const std::shared_ptr<const FileBytes> &file)
+{
+    return HeaderReader(file).read(file->path());
+}
+
+bool parseLandXmlAngle(std::string_view text, LandXmlAngle form, double &radians)
+{
+    double number = 0;
+    const bool isAngle = form == LandXmlAngle::DegreesMinutesSeconds ? parseDegreesMinutesSeconds(text, number)
+                                                                     : parseNumber(text, number);
+    switch (form) {
+    case LandXmlAngle::Radians: radians = number; break;
+    case LandXmlAngle::Grads: radians = number * std::numbers::pi / 200; break;
+    case LandXmlAngle::Degrees:
+    case LandXmlAngle::DegreesMinutesSeconds: radians = number * std::numbers::pi / 180; break;
+    }
+    return isAngle && std::isfinite(radians);
+}
+
+} // namespace kareport

@@ -1,0 +1,45 @@
+#pragma once
+
+#include "XmlStream.h"
+
+#include <QString>
+
+#include <memory>
+#include <string_view>
+
+namespace kareport
+{
+
+/// How a file writes angles.
+enum class LandXmlAngle
+{
+    Radians,
+    Grads,
+    Degrees,
+    DegreesMinutesSeconds ///< 45.3015 is 45°30'15"
+};
+
+/// The units of a file.
+struct LandXmlUnits
+{
+    double metres = 1;       ///< in a unit of length
+    double squareMetres = 1; ///< in a unit of area
+    LandXmlAngle angle = LandXmlAngle::Radians;
+    LandXmlAngle direction = LandXmlAngle::Radians;
+};
+
+/// What stands before a file's data.
+struct LandXmlHeader
+{
+    QString version; ///< empty where the file says none
+    LandXmlUnits units;
+};
+
+/// Reads a file up to its units. A file without them, or with a unit that is not known, is wrong: nobody could say what its
+/// numbers are.
+Expected<LandXmlHeader> readLandXmlHeader(const std::shared_ptr<const FileBytes> &file);
+
+/// An angle of a file, in radians. @return whether the text is one
+bool parseLandXmlAngle(std::string_view text, LandXmlAngle form, double &radians);
+
+} // namespace kareport

@@ -1,0 +1,60 @@
+#pragma once
+
+#include "LandXmlRows.h"
+
+namespace kareport
+{
+
+/// Rows that are made from what a file holds as a whole: it is read when the first one is asked for.
+class ModelRows : public LandXmlRows
+{
+public:
+    bool next() final
+    {
+        if (!isLoaded_) {
+            isLoaded_ = true;
+            isSound_ = load();
+        }
+        if (!isSound_ || index_ + 1 >= count_) {
+            return false;
+        }
+        take(++index_);
+        return true;
+    }
+    void rewind() final { index_ = beforeFirst; }
+    void goTo(std::size_t index) final
+    {
+        index_ = index;
+        take(index);
+    }
+
+protected:
+    using LandXmlRows::LandXmlRows;
+
+    /// Reads the file and sets the number of rows. @return false when something is wrong
+    virtual bool load() = 0;
+    /// Goes to a row.
+    virtual void take(std::size_t index) = 0;
+
+    std::size_t count_ = 0;
+
+private:
+    static constexpr std::size_t beforeFirst = std::size_t(-1); // one more is 0
+
+    bool isLoaded_ = false;
+    bool isSound_ = false;
+    std::size_t index_ = beforeFirst;
+};
+
+/// The variables of rows by their getters.
+template <typename Rows, std::size_t count>
+std::vector<LandXmlVariable> variablesOf(const LandXmlGetter<Rows> (&getters)[count])
+{
+    std::vector<LandXmlVariable> variables;
+    for (const LandXmlGetter<Rows> &getter : getters) {
+        variables.push_back({QString::fromLatin1(getter.name), getter.type});
+    }
+    return variables;
+}
+
+} // namespace kareport

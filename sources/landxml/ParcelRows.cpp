@@ -1,0 +1,239 @@
+#include "ParcelRows.h"
+
+#include "CurveFit.h"
+#include "VariableType.h"
+#include "Xlate.h"
+
+#include <limits>
+
+namespace kareport
+{
+
+namespace
+{
+
+LandXmlValue count(std::size_t number)
+{
+    return static_cast<double>(number);
+}
+
+} // namespace
+
+bool BorderRows::readParcels()
+{
+    LandXmlWants wants;
+    wants.parcels = true;
+    const auto reader = readAll(wants);
+    if (!reader) {
+        return false;
+    }
+    parcels_ = std::move(reader->parcels);
+    bool refers = false;
+    for (const LandXmlParcel &parcel : parcels_) {
+        refers = refers || hasReferences(parcel.elements);
+    }
+    const LandXmlPointTable *points = refers ? pointTable() : nullptr;
+    if (refers && points == nullptr) {
+        return false;
+    }
+    const LandXmlGeometry geometry(source_.header.units, source_.query.tolerance, points, &modelNotes_);
+    std::size_t budget = 1000000;
+    for (const LandXmlParcel &parcel : parcels_) {
+        if (!isNamed(parcel.name)) {
+            continue;
+        }
+        borders_.push_back(borderOf(parcel, geometry));
+        for (const auto &[element, curve] : borders_.back().courses) {
+            if (curve.pieces() > budget) {
+                fail(parcel.byte, Xlate("the elements wind round too often"));
+                return false;
+            }
+            budget -= curve.isLine() || curve.pieces() == 1 ? 0 : curve.pieces();
+        }
+    }
+    return true;
+}
+
+ParcelBorder BorderRows::borderOf(const LandXmlParcel &parcel, const LandXmlGeometry &geometry)
+{
+    ParcelBorder border;
+    border.stored = &parcel;
+    bool isWhole = !parcel.elements.empty();
+    for (std::size_t i = 0; i < parcel.elements.size(); ++i) {
+        const LandXmlCurves made = geometry.curvesOf(parcel.elements[i]);
+        if (const auto *fault = std::get_if<LandXmlFault>(&made)) {
+            modelNotes_.add(fault->byte, fault->text);
+            isWhole = false;
+            continue;
+        }
+        for (const PlaneCurve &curve : std::get<std::vector<PlaneCurve>>(made)) {
+            border.courses.emplace_back(i, curve);
+        }
+    }
+    measure(border, isWhole && !border.courses.empty());
+    // One part in a thousand, or a tenth of a square metre: areas are stated with few digits.
+    const double stated = parcel.area;
+    if (border.area && std::fabs(stated - *border.area) > std::max(0.1, 0.001 * stated)) {
+        modelNotes_.add(parcel.byte,
+                        Xlate("%1 is %2 in the file, but %3 by its geometry")
+                            .arg(QStringLiteral("area"),
+                                 QString::number(stated / source_.header.units.squareMetres, 'f', 4),
+                                 QString::number(*border.area / source_.header.units.squareMetres, 'f', 4)));
+    }
+    return border;
+}
+
+void BorderRows::measure(ParcelBorder &border, bool isWhole)
+{
+    if (!isWhole) {
+        return;
+    }
+    const PlanePoint origin = border.courses.front().second.start().point;
+    double area = 0;
+    double perimeter = 0;
+    double gap = 0;
+    PlanePoint before = border.courses.back().second.end().point - origin;
+    for (const auto &[element, curve] : border.courses) {
+        const PlanePoint from = curve.start().point - origin;
+        const PlanePoint to = curve.end().point - origin;
+        gap = std::max(gap, distanceBetween(before, from));
+        area += (from.northing * to.easting - from.easting * to.northing) / 2 + curve.areaBesideChord();
+        perimeter += curve.length();
+        before = to;
+    }
+    border.perimeter = perimeter;
+    // What surveyors leave open is a few centimetres; more is another border than the one that was meant.
+    constexpr double widest = 0.1;
+    if (gap > widest) {
+        modelNotes_.add(
+            border.stored->byte,
+            Xlate("the border of the parcel does not close: %1 metres are open").arg(QString::number(gap, 'f', 3)));
+        return;
+    }
+    border.area = std::fabs(area);
+}
+
+struct ParcelRows::Variables
+{
+    using Rows = ParcelRows;
+    static constexpr LandXmlGetter<Rows> getters[] = {
+        {"Parcel", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.border_->stored->name); }},
+        {"Description", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.border_->stored->description); }},
+        {"PartOf", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.border_->stored->owner); }},
+        {"Area", VARIABLE_AREA, [](const Rows &rows) { return valueOf(rows.border_->area); }},
+        {"StatedArea", VARIABLE_AREA, [](const Rows &rows) { return valueOf(rows.border_->stored->area); }},
+        {"Perimeter", VARIABLE_LENGTH, [](const Rows &rows) { return valueOf(rows.border_->perimeter); }},
+        {"Courses", VARIABLE_INTEGER, [](const Rows &rows) { return count(rows.border_->courses.size()); }},
+        {"CentreNorthing", VARIABLE_COORDINATE,
+         [](const Rows &rows) {
+             const auto &centre = rows.border_->stored->centre.position;
+             return centre ? valueOf(centre->northing) : LandXmlValue();
+         }},
+        {"CentreEasting", VARIABLE_COORDINATE,
+         [](const Rows &rows) {
+             const auto &centre = rows.border_->stored->centre.position;
+             return centre ? valueOf(centre->easting) : LandXmlValue();
+         }},
+    };
+};
+
+std::vector<LandXmlVariable> ParcelRows::variables() const
+{
+    return variablesOf(Variables::getters);
+}
+
+LandXmlValue ParcelRows::value(std::size_t variable) const
+{
+    return Variables::getters[variable].get(*this);
+}
+
+bool ParcelRows::load()
+{
+    const bool isRead = readParcels();
+    count_ = borders_.size();
+    return isRead;
+}
+
+struct CourseRows::Variables
+{
+    using Rows = CourseRows;
+    static LandXmlValue ofArc(const Rows &rows, double value)
+    {
+        return rows.curve_->isArc() ? valueOf(value) : LandXmlValue();
+    }
+    static const LandXmlElement &element(const Rows &rows)
+    {
+        return rows.border_->stored->elements[rows.border_->courses[rows.index_].first];
+    }
+
+    static constexpr LandXmlGetter<Rows> getters[] = {
+        {"Parcel", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.border_->stored->name); }},
+        {"Area", VARIABLE_AREA, [](const Rows &rows) { return valueOf(rows.border_->area); }},
+        {"Perimeter", VARIABLE_LENGTH, [](const Rows &rows) { return valueOf(rows.border_->perimeter); }},
+        {"Course", VARIABLE_INTEGER, [](const Rows &rows) { return count(rows.index_ + 1); }},
+        {"Name", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(element(rows).name); }},
+        {"Rotation", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(element(rows).rotation); }},
+        {"StartNorthing", VARIABLE_COORDINATE,
+         [](const Rows &rows) { return valueOf(rows.curve_->start().point.northing); }},
+        {"StartEasting", VARIABLE_COORDINATE,
+         [](const Rows &rows) { return valueOf(rows.curve_->start().point.easting); }},
+        {"EndNorthing", VARIABLE_COORDINATE,
+         [](const Rows &rows) { return valueOf(rows.curve_->end().point.northing); }},
+        {"EndEasting", VARIABLE_COORDINATE, [](const Rows &rows) { return valueOf(rows.curve_->end().point.easting); }},
+        {"Bearing", VARIABLE_BEARING,
+         [](const Rows &rows) {
+             return valueOf(bearingBetween(rows.curve_->start().point, rows.curve_->end().point));
+         }},
+        {"Distance", VARIABLE_DISTANCE,
+         [](const Rows &rows) {
+             return valueOf(distanceBetween(rows.curve_->start().point, rows.curve_->end().point));
+         }},
+        {"Length", VARIABLE_LENGTH, [](const Rows &rows) { return valueOf(rows.curve_->length()); }},
+        {"Radius", VARIABLE_LENGTH,
+         [](const Rows &rows) {
+             constexpr double infinite = std::numeric_limits<double>::infinity();
+             return rows.curve_->isLine() ? valueOf(infinite)
+                                          : ofArc(rows, std::fabs(1 / rows.curve_->startCurvature()));
+         }},
+        {"Deflection", VARIABLE_ANGLE,
+         [](const Rows &rows) { return ofArc(rows, rows.curve_->turnTo(rows.curve_->length())); }},
+        {"StartBearing", VARIABLE_BEARING, [](const Rows &rows) { return valueOf(rows.curve_->start().bearing); }},
+        {"EndBearing", VARIABLE_BEARING, [](const Rows &rows) { return valueOf(rows.curve_->end().bearing); }},
+    };
+};
+
+std::vector<LandXmlVariable> CourseRows::variables() const
+{
+    return variablesOf(Variables::getters);
+}
+
+LandXmlValue CourseRows::value(std::size_t variable) const
+{
+    return Variables::getters[variable].get(*this);
+}
+
+std::size_t CourseRows::byte() const
+{
+    return Variables::element(*this).byte;
+}
+
+bool CourseRows::load()
+{
+    const bool isRead = readParcels();
+    for (std::size_t border = 0; border < borders_.size(); ++border) {
+        for (std::size_t course = 0; course < borders_[border].courses.size(); ++course) {
+            rows_.emplace_back(border, course);
+        }
+    }
+    count_ = rows_.size();
+    return isRead;
+}
+
+void CourseRows::take(std::size_t index)
+{
+    border_ = &borders_[rows_[index].first];
+    index_ = rows_[index].second;
+    curve_ = &border_->courses[index_].second;
+}
+
+} // namespace kareport

@@ -1,0 +1,92 @@
+#include "SectionRows.h"
+
+#include "VariableType.h"
+
+namespace kareport
+{
+
+struct SectionRows::Variables
+{
+    using Rows = SectionRows;
+    static const LandXmlSectionPoint &point(const Rows &rows) { return rows.surface_->points[rows.index_]; }
+    static LandXmlValue coordinate(const Rows &rows, double PlanePoint::*part)
+    {
+        if (!rows.place_) {
+            return {};
+        }
+        return valueOf(pointBeside(rows.place_->point, rows.place_->bearing, point(rows).offset).*part);
+    }
+
+    static constexpr LandXmlGetter<Rows> getters[] = {
+        {"Alignment", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.route_->stored->name); }},
+        {"Station", VARIABLE_STATION,
+         [](const Rows &rows) { return valueOf(rows.route_->stationing.nameOf(rows.section_->station).station); }},
+        {"Section", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.section_->name); }},
+        {"Surface", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.surface_->name); }},
+        {"IsDesign", VARIABLE_BOOLEAN,
+         [](const Rows &rows) { return LandXmlValue(rows.surface_->isDesign ? 1.0 : 0.0); }},
+        {"Side", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.surface_->side); }},
+        {"Material", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.surface_->material); }},
+        {"Point", VARIABLE_INTEGER,
+         [](const Rows &rows) { return LandXmlValue(static_cast<double>(rows.index_ + 1)); }},
+        {"Code", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(point(rows).code); }},
+        {"Offset", VARIABLE_OFFSET, [](const Rows &rows) { return valueOf(point(rows).offset); }},
+        {"Elevation", VARIABLE_ELEVATION, [](const Rows &rows) { return valueOf(point(rows).height); }},
+        {"Northing", VARIABLE_COORDINATE, [](const Rows &rows) { return coordinate(rows, &PlanePoint::northing); }},
+        {"Easting", VARIABLE_COORDINATE, [](const Rows &rows) { return coordinate(rows, &PlanePoint::easting); }},
+        {"Width", VARIABLE_LENGTH, [](const Rows &rows) { return valueOf(rows.surface_->width); }},
+        {"Thickness", VARIABLE_LENGTH, [](const Rows &rows) { return valueOf(rows.surface_->thickness); }},
+        {"CutArea", VARIABLE_AREA, [](const Rows &rows) { return valueOf(rows.section_->cutArea); }},
+        {"FillArea", VARIABLE_AREA, [](const Rows &rows) { return valueOf(rows.section_->fillArea); }},
+    };
+};
+
+std::vector<LandXmlVariable> SectionRows::variables() const
+{
+    return variablesOf(Variables::getters);
+}
+
+LandXmlValue SectionRows::value(std::size_t variable) const
+{
+    return Variables::getters[variable].get(*this);
+}
+
+bool SectionRows::load()
+{
+    LandXmlWants wants;
+    wants.sections = true;
+    if (!readAlignments(model_, wants)) {
+        return false;
+    }
+    const std::string surface = source_.query.surface.toStdString();
+    for (const LandXmlRoute &route : model_.routes) {
+        if (!isNamed(route.stored->name)) {
+            continue;
+        }
+        for (const LandXmlSection &section : route.stored->sections) {
+            for (const LandXmlSectionSurface &layer : section.surfaces) {
+                const std::size_t points = surface.empty() || layer.name == surface ? layer.points.size() : 0;
+                for (std::size_t i = 0; i < points; ++i) {
+                    rows_.push_back({&route, &section, &layer, i});
+                }
+            }
+        }
+    }
+    count_ = rows_.size();
+    return true;
+}
+
+void SectionRows::take(std::size_t index)
+{
+    const Row &row = rows_[index];
+    const bool isNew = section_ != row.section;
+    route_ = row.route;
+    section_ = row.section;
+    surface_ = row.surface;
+    index_ = row.point;
+    if (isNew) {
+        place_ = route_->fault ? std::nullopt : route_->alignment.at(section_->station - route_->stationing.start());
+    }
+}
+
+} // namespace kareport

@@ -1,0 +1,304 @@
+#include "XmlStream.h"
+
+#include "Xlate.h"
+
+#include <algorithm>
+#include <array>
+#include <expat.h>
+#include <string>
+#include <vector>
+
+namespace kareport
+{
+
+namespace
+{
+
+constexpr std::size_t blockSize = std::size_t(1) << 16;
+
+/// The characters of Windows' western code page from 0x80 to 0x9F; -1 where it has none.
+constexpr std::array<int, 32> westernSigns = {0x20AC, -1,     0x201A, 0x0192, 0x201E, 0x2026, 0x2020, 0x2021,
+                                              0x02C6, 0x2030, 0x0160, 0x2039, 0x0152, -1,     0x017D, -1,
+                                              -1,     0x2018, 0x2019, 0x201C, 0x201D, 0x2022, 0x2013, 0x2014,
+                                              0x02DC, 0x2122, 0x0161, 0x203A, 0x0153, -1,     0x017E, 0x0178};
+
+QString utf8(std::string_view text)
+{
+    constexpr std::size_t longest = 200;
+    return QString::fromUtf8(text.data(), static_cast<qsizetype>(std::min(text.size(), longest)));
+}
+
+std::string_view prefixOf(std::string_view name)
+{
+    const std::size_t colon = name.find(':');
+    return colon == std::string_view::npos ? std::string_view() : name.substr(0, colon);
+}
+
+} // namespace
+
+std::optional<std::string_view> XmlAttributes::find(std::string_view name) const
+{
+    for (const char *const *pair = pairs_; *pair != nullptr; pair += 2) {
+        if (name == *pair) {
+            return pair[1];
+        }
+    }
+    return std::nullopt;
+}
+
+/// Which prefixes stand for the vocabulary of the outermost element.
+struct XmlStream::Vocabulary
+{
+    struct Binding
+    {
+        std::string prefix;
+        bool isOurs;
+        int depth;
+    };
+
+    std::string uri;
+    std::string rootPrefix;
+    std::vector<Binding> bindings;
+
+    void bind(const XmlAttributes &attributes, int depth)
+    {
+        for (const char *const *pair = attributes.pairs(); *pair != nullptr; pair += 2) {
+            const std::string_view name = pair[0];
+            if (!name.starts_with("xmlns") || (name.size() > 5 && name[5] != ':')) {
+                continue;
+            }
+            const std::string_view prefix = name.size() > 5 ? name.substr(6) : std::string_view();
+            if (depth == 1 && prefix == rootPrefix) {
+                uri = pair[1];
+            }
+            bindings.push_back({std::string(prefix), uri == pair[1], depth});
+        }
+        if (depth == 1) { // the outermost element's own binding may stand after others
+            for (Binding &binding : bindings) {
+                const auto value = attributes.find(binding.prefix.empty() ? "xmlns" : "xmlns:" + binding.prefix);
+                binding.isOurs = value == uri;
+            }
+        }
+    }
+
+    bool has(std::string_view name) const
+    {
+        const std::string_view prefix = prefixOf(name);
+        for (auto binding = bindings.rbegin(); binding != bindings.rend(); ++binding) {
+            if (binding->prefix == prefix) {
+                return binding->isOurs;
+            }
+        }
+        return prefix == rootPrefix; // a prefix that nobody has declared
+    }
+
+    void unbind(int depth)
+    {
+        while (!bindings.empty() && bindings.back().depth >= depth) {
+            bindings.pop_back();
+        }
+    }
+};
+
+/// What the parser calls. An exception must not pass through it: it is kept until the parser has come back.
+struct XmlStream::Callbacks
+{
+    template <typename Function>
+    static void guarded(void *data, const Function &function)
+    {
+        auto &stream = *static_cast<XmlStream *>(data);
+        if (stream.isStopped_) {
+            return; // the parser ends what it has begun
+        }
+        try {
+            function(stream);
+        } catch (...) {
+            stream.thrown_ = std::current_exception();
+            stream.stop();
+        }
+    }
+
+    static void start(void *data, const char *name, const char **attributes)
+    {
+        guarded(data, [&](XmlStream &stream) { stream.started(name, attributes); });
+    }
+
+    static void end(void *data, const char *)
+    {
+        guarded(data, [](XmlStream &stream) { stream.ended(); });
+    }
+
+    static void text(void *data, const char *characters, int count)
+    {
+        if (static_cast<XmlStream *>(data)->wantsText_) {
+            guarded(data, [&](XmlStream &stream) {
+                stream.handler_.text({characters, static_cast<std::size_t>(count)});
+            });
+        }
+    }
+
+    static void entity(void *data, const char *name, int, const char *, int, const char *, const char *, const char *,
+                       const char *)
+    {
+        guarded(data, [&](XmlStream &stream) {
+            stream.fail(
+                stream.currentByte(),
+                Xlate("the file declares the entity \"%1\": a file without entities was expected").arg(utf8(name)));
+        });
+    }
+
+    static void skippedEntity(void *data, const char *name, int)
+    {
+        guarded(data, [&](XmlStream &stream) {
+            stream.fail(stream.currentByte(), Xlate("the entity \"%1\" is not known").arg(utf8(name)));
+        });
+    }
+
+    static int encoding(void *, const char *name, XML_Encoding *encoding)
+    {
+        std::string folded(name);
+        std::transform(folded.begin(), folded.end(), folded.begin(), [](char letter) {
+            return letter >= 'A' && letter <= 'Z' ? static_cast<char>(letter + 32) : letter;
+        });
+        if (folded != "windows-1252" && folded != "cp1252") {
+            return XML_STATUS_ERROR;
+        }
+        for (int i = 0; i < 256; ++i) {
+            encoding->map[i] = i >= 0x80 && i < 0xA0 ? westernSigns[static_cast<std::size_t>(i - 0x80)] : i;
+        }
+        encoding->data = nullptr;
+        encoding->convert = nullptr;
+        encoding->release = nullptr;
+        return XML_STATUS_OK;
+    }
+};
+
+XmlStream::XmlStream(std::shared_ptr<const FileBytes> file, XmlHandler &handler)
+    : file_(std::move(file)),
+      handler_(handler),
+      parser_(XML_ParserCreate(nullptr)),
+      vocabulary_(std::make_unique<Vocabulary>())
+{
+    if (parser_ == nullptr) {
+        throw std::bad_alloc();
+    }
+    XML_SetUserData(parser_, this);
+    XML_SetElementHandler(parser_, Callbacks::start, Callbacks::end);
+    XML_SetCharacterDataHandler(parser_, Callbacks::text);
+    XML_SetEntityDeclHandler(parser_, Callbacks::entity);
+    XML_SetSkippedEntityHandler(parser_, Callbacks::skippedEntity);
+    XML_SetUnknownEncodingHandler(parser_, Callbacks::encoding, nullptr);
+}
+
+XmlStream::~XmlStream()
+{
+    XML_ParserFree(parser_);
+}
+
+std::size_t XmlStream::currentByte() const
+{
+    const XML_Index index = XML_GetCurrentByteIndex(parser_);
+    return index < 0 ? 0 : static_cast<std::size_t>(index);
+}
+
+void XmlStream::stop()
+{
+    isStopped_ = true;
+    XML_StopParser(parser_, XML_FALSE);
+}
+
+void XmlStream::fail(std::size_t byte, const QString &text)
+{
+    if (!error_) {
+        error_ = InputError{file_->path(), FilePlaces(*file_).of(byte), text};
+    }
+    stop();
+}
+
+bool XmlStream::readSome()
+{
+    const std::string_view bytes = file_->view();
+    if (isStopped_ || error_ || (position_ == bytes.size() && position_ > 0)) {
+        return false;
+    }
+    const std::string_view block = bytes.substr(position_, blockSize);
+    position_ += block.size();
+    const bool isLast = position_ == bytes.size();
+    const auto status = XML_Parse(parser_, block.data(), static_cast<int>(block.size()), isLast ? 1 : 0);
+    if (thrown_) {
+        std::rethrow_exception(thrown_);
+    }
+    file_->release(position_ - block.size());
+    if (status == XML_STATUS_ERROR) {
+        failParsing();
+        return false;
+    }
+    // A tag that does not end is looked through again with every block.
+    if (!isLast && position_ - currentByte() > longestTag) {
+        error_ = InputError{file_->path(), FilePlaces(*file_).of(currentByte()),
+                            Xlate("the tag has more than %1 bytes").arg(longestTag)};
+    }
+    return !isLast && !error_;
+}
+
+void XmlStream::failParsing()
+{
+    if (error_ || isStopped_) {
+        return;
+    }
+    const XML_Error code = XML_GetErrorCode(parser_);
+    if (code == XML_ERROR_NO_MEMORY) {
+        throw std::bad_alloc();
+    }
+    QString text = Xlate("the file is no well-formed XML: %1").arg(QString::fromUtf8(XML_ErrorString(code)));
+    if (code == XML_ERROR_UNKNOWN_ENCODING) {
+        text = Xlate(
+            "the encoding of the file is not known: UTF-8, UTF-16, ISO-8859-1, US-ASCII or windows-1252 was expected");
+    }
+    error_ = InputError{file_->path(), FilePlaces(*file_).of(currentByte()), text};
+}
+
+void XmlStream::started(const char *name, const char *const *attributes)
+{
+    if (++depth_ > deepest) {
+        fail(currentByte(), Xlate("the elements are nested more than %1 deep").arg(deepest));
+        return;
+    }
+    if (passedOverFrom_ != 0) {
+        return;
+    }
+    wantsText_ = false;
+    const XmlAttributes found(attributes);
+    if (depth_ == 1) {
+        vocabulary_->rootPrefix = prefixOf(name);
+    }
+    vocabulary_->bind(found, depth_);
+    if (!vocabulary_->has(name)) {
+        handler_.foreignElement(name);
+        passedOverFrom_ = depth_;
+        return;
+    }
+    std::string_view local = name;
+    if (const std::size_t colon = local.find(':'); colon != std::string_view::npos) {
+        local.remove_prefix(colon + 1);
+    }
+    const auto interest = handler_.startElement(local, found);
+    wantsText_ = interest == XmlHandler::Interest::Text;
+    if (interest == XmlHandler::Interest::None) {
+        passedOverFrom_ = depth_;
+    }
+}
+
+void XmlStream::ended()
+{
+    if (passedOverFrom_ == 0) {
+        wantsText_ = false;
+        handler_.endElement();
+    } else if (passedOverFrom_ == depth_) {
+        passedOverFrom_ = 0;
+    }
+    vocabulary_->unbind(depth_);
+    --depth_;
+}
+
+} // namespace kareport

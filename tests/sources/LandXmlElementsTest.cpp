@@ -1,0 +1,296 @@
+#include "InputErrorText.h"
+#include "LandXmlFile.h"
+#include "LandXmlRoad.h"
+
+#include <gtest/gtest.h>
+
+#include <cmath>
+
+namespace
+{
+
+using namespace kareport;
+using namespace landxml;
+using Kind = LandXmlListKind;
+
+constexpr double pi = std::numbers::pi;
+
+TEST(LandXmlElements, AreListedAsTheyAreStored)
+{
+    LandXmlFile file(fileOf(alignment(bend(), "name='road' staStart='10'")), queryOf(Kind::Elements),
+                     {QStringLiteral("Alignment"), QStringLiteral("Element"), QStringLiteral("Type"),
+                      QStringLiteral("StartStation"), QStringLiteral("EndStation"), QStringLiteral("Length"),
+                      QStringLiteral("Radius"), QStringLiteral("StartPoint")});
+    EXPECT_EQ(file.rows(3), QStringList({u"road|1|Line|10.000|110.000|100.000|inf|A"_qs,
+                                         u"road|2|Curve|110.000|267.080|157.080|100.000|B"_qs,
+                                         u"road|3|Line|267.080|317.080|50.000|inf|C"_qs}));
+    EXPECT_EQ(file.notes(), QStringList());
+}
+
+TEST(LandXmlElements, OfACurveHaveItsCentreItsTangentsAndItsDeflection)
+{
+    LandXmlFile file(fileOf(alignment(bend())), queryOf(Kind::Elements));
+    struct Row
+    {
+        const char *variable;
+        double value;
+    };
+    const Row rows[] = {{"StartBearing", 0},     {"EndBearing", pi / 2},   {"Deflection", pi / 2},
+                        {"StartNorthing", 1100}, {"StartEasting", 500},    {"EndNorthing", 1200},
+                        {"EndEasting", 600},     {"CentreNorthing", 1100}, {"CentreEasting", 600},
+                        {"PINorthing", 1200},    {"PIEasting", 500}};
+    for (const Row &row : rows) {
+        EXPECT_NEAR(file.number(1, row.variable), row.value, 1e-9) << row.variable;
+    }
+    EXPECT_TRUE(std::isnan(file.number(0, "CentreNorthing"))) << "a line has none";
+    EXPECT_TRUE(std::isnan(file.number(0, "Parameter")));
+}
+
+TEST(LandXmlElements, TransitionsOfAllFormsFitTheirPoints)
+{
+    struct Row
+    {
+        const char *name;
+        TransitionForm form;
+    };
+    const Row rows[] = {
+        {"clothoid", TransitionForm::Clothoid},           {"bloss", TransitionForm::Bloss},
+        {"biquadratic", TransitionForm::Biquadratic},     {"cosine", TransitionForm::Cosine},
+        {"sinusoid", TransitionForm::Sinusoid},           {"cubicParabola", TransitionForm::CubicParabola},
+        {"japaneseCubic", TransitionForm::CubicParabola}, {"sineHalfWave", TransitionForm::SineHalfWave}};
+    for (const Row &row : rows) {
+        for (const auto &[first, last] :
+             {std::pair(0.0, 1 / 250.0), std::pair(0.0, -1 / 250.0), std::pair(1 / 90.0, 0.0),
+              std::pair(-1 / 90.0, 0.0), std::pair(1 / 200.0, 1 / 90.0)})
+        {
+            if (isOverTangent(row.form) && first != 0 && last != 0) {
+                continue;
+            }
+            const PlaneCurve made = curve(row.form, {5516120, 3512822}, 2.3, 62.5, first, last);
+            LandXmlFile file(fileOf(alignment(spiral(made, row.name))), queryOf(Kind::Elements));
+            EXPECT_NEAR(file.number(0, "StartBearing"), 2.3, 1e-8) << row.name << " " << first << " to " << last;
+            EXPECT_NEAR(file.number(0, "EndBearing"), made.end().bearing, 1e-8) << row.name;
+            EXPECT_NEAR(file.number(0, "Deflection"), made.turnTo(62.5), 1e-12) << row.name;
+            EXPECT_NEAR(file.number(0, "EndNorthing"), made.end().point.northing, 1e-7) << row.name;
+            EXPECT_EQ(file.notes(), QStringList()) << row.name << " " << first << " to " << last;
+            const double parameter = std::sqrt(62.5 / std::fabs(first - last));
+            EXPECT_EQ(file.number(0, "Parameter") > 0, row.form == TransitionForm::Clothoid);
+            if (row.form == TransitionForm::Clothoid) {
+                EXPECT_NEAR(file.number(0, "Parameter"), parameter, 1e-5);
+            }
+        }
+    }
+}
+
+TEST(LandXmlElements, CurvesWithoutACentreHaveTheirRadius)
+{
+    const QByteArray ends = "<Start>0 0</Start><End>6 0</End></Curve>";
+    struct Row
+    {
+        const char *attributes;
+        double centre;
+        const char *reason;
+    };
+    const Row rows[] = {{"rot='cw' radius='5'", 4, "the short way"},
+                        {"rot='ccw' radius='5'", -4, "to the left"},
+                        {"rot='cw' radius='5' length='24.9809'", -4, "the long way, by its length"},
+                        {"rot='cw' radius='5' delta='286.26'", -4, "by its angle"}};
+    for (const Row &row : rows) {
+        LandXmlFile file(fileOf(alignment(QByteArray("<Curve ") + row.attributes + ">" + ends)),
+                         queryOf(Kind::Elements));
+        EXPECT_NEAR(file.number(0, "CentreEasting"), row.centre, 1e-9) << row.reason;
+        EXPECT_EQ(file.notes(), QStringList()) << row.reason;
+    }
+}
+
+TEST(LandXmlElements, AFullCircleIsToldFromNothingByItsLength)
+{
+    struct Row
+    {
+        const char *attributes;
+        const char *end;
+        const char *row;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {"length='628.3185'", "1100 500", "628.319", "a circle"},
+        {"delta='360'", "1100 500", "628.319", "by its angle"},
+        {"length='0.0001'", "1099.9999 500", "0.000", "an end that its digits put before the start"},
+        {"length='628.3184'", "1099.9999 500", "628.318", "nearly a circle"},
+    };
+    for (const Row &row : rows) {
+        LandXmlFile file(
+            fileOf(alignment(QByteArray("<Curve rot='cw' ") + row.attributes +
+                             "><Start>1100 500</Start><Center>1100 600</Center><End>" + row.end + "</End></Curve>")),
+            queryOf(Kind::Elements), {QStringLiteral("Length")});
+        EXPECT_EQ(file.rows(3), QStringList(QString::fromLatin1(row.row))) << row.reason;
+        EXPECT_EQ(file.notes(), QStringList()) << row.reason;
+    }
+    for (const char *nothing : {"", "length='0'", "delta='0'"}) {
+        LandXmlFile file(
+            fileOf(alignment(QByteArray("<Curve rot='cw' ") + nothing +
+                             "><Start>1100 500</Start><Center>1100 600</Center><End>1100 500</End></Curve>")),
+            queryOf(Kind::Elements));
+        EXPECT_EQ(file.rows(), QStringList()) << nothing;
+        EXPECT_EQ(file.notes(), QStringList(u"5:1: the element has no length and is passed over"_qs)) << nothing;
+    }
+}
+
+TEST(LandXmlElements, IrregularLinesAreTheirPieces)
+{
+    LandXmlFile file(fileOf(alignment("<IrregularLine><Start>0 0</Start><End>10 10</End><PntList2D>0 0 10 0 10 5 10 "
+                                      "5</PntList2D></IrregularLine>")),
+                     queryOf(Kind::Elements),
+                     {QStringLiteral("Type"), QStringLiteral("Length"), QStringLiteral("EndBearing")});
+    EXPECT_EQ(file.rows(3), QStringList(u"IrregularLine|20.000|1.571"_qs)) << "points that stand twice make no line";
+}
+
+TEST(LandXmlElements, WhatDiffersFromTheGeometryIsNotedWithBothValues)
+{
+    const PlaneCurve made = curve(TransitionForm::Clothoid, {100, 200}, 0, 62.5, 0, 1 / 250.0);
+    QByteArray moved = spiral(made, "clothoid");
+    moved.replace(number(made.end().point.northing), number(made.end().point.northing + 0.5));
+    QByteArray mirrored = spiral(made, "clothoid");
+    mirrored.replace("<End>", "<PI>141.6873 200</PI><End>").replace("'cw'", "'ccw'");
+    struct Row
+    {
+        QByteArray elements;
+        const char *note;
+        const char *reason;
+    };
+    const Row rows[] = {
+        {"<Line length='10.003'><Start>0 0</Start><End>10 0</End></Line>",
+         "5:1: length is 10.0030 in the file, but 10.0000 by its geometry", "a length"},
+        {"<Line dir='90.002'><Start>0 0</Start><End>0 10</End></Line>",
+         "5:1: dir is 90.00200 in the file, but 90.00000 by its geometry", "a direction"},
+        {"<Curve rot='cw' radius='100.01'><Start>1100 500</Start><Center>1100 600</Center><End>1200 600</End></Curve>",
+         "5:1: radius is 100.0100 in the file, but 100.0000 by its geometry", "a radius"},
+        {"<Curve rot='cw'><Start>1100 500</Start><Center>1100 600</Center><End>1200.01 600</End></Curve>",
+         "5:1: End is 1200.0100 600.0000 in the file, but 1200.0000 600.0000 by its geometry", "an end"},
+        {moved, "5:1: End is 162.9024 202.6013 in the file, but 162.4033 202.5806 by its geometry",
+         "the end of a transition, which was laid towards it"},
+        {mirrored, "5:1: PI is 3.4695 beside the tangents of the element: perhaps the element bends to the other side",
+         "a transition to the wrong side"},
+        {"<Line staStart='5'><Start>0 0</Start><End>10 0</End></Line>",
+         "5:1: staStart is 5.0000 in the file, but 0.0000 by its geometry", "a station"},
+        {"<Line><Start>0 0</Start><End>10 0</End></Line>\n<Line><Start>10.5 0</Start><End>20 0</End></Line>",
+         "6:1: Start is 0.5000 in the file, but 0.0000 by its geometry", "a gap"},
+        {"<Line><Start>0 0</Start><End>10 0</End></Line>\n<Line><Start>10 0</Start><End>10 0</End></Line>",
+         "6:1: the element has no length and is passed over", "nothing"},
+    };
+    for (const Row &row : rows) {
+        LandXmlFile file(fileOf(alignment(row.elements)), queryOf(Kind::Elements));
+        EXPECT_NE(file.list->GetAt(0), nullptr) << row.reason;
+        file.rows();
+        EXPECT_EQ(file.notes(), QStringList(QString::fromLatin1(row.note))) << row.reason;
+    }
+}
+
+TEST(LandXmlElements, TheToleranceIsTheJobs)
+{
+    LandXmlQuery query = queryOf(Kind::Elements);
+    query.tolerance.length = 0.01;
+    LandXmlFile file(fileOf(alignment("<Line length='10.003'><Start>0 0</Start><End>10 0</End></Line>")), query);
+    file.rows();
+    EXPECT_EQ(file.notes(), QStringList());
+}
+
+TEST(LandXmlElements, DirectionsMayBeMeasuredInEachOfTheWaysThatProgramsKnow)
+{
+    // Towards south-east.
+    for (const char *direction : {"135", "225", "-45", "315"}) {
+        LandXmlFile file(
+            fileOf(alignment(QByteArray("<Line dir='") + direction + "'><Start>0 0</Start><End>-10 10</End></Line>")),
+            queryOf(Kind::Elements));
+        file.rows();
+        EXPECT_EQ(file.notes(), QStringList()) << direction;
+    }
+}
+
+TEST(LandXmlElements, WithoutGeometryAreListedAndSaid)
+{
+    const QByteArray ends = "<Start>0 0</Start><End>10 5</End>";
+    struct Row
+    {
+        QByteArray element;
+        const char *contains;
+        const char *reason;
+    };
+    const Row rows[] = {
+        {"<Spiral length='10' rot='cw' spiType='revBloss' radiusStart='INF' radiusEnd='50'>" + ends + "</Spiral>",
+         "not supported: a transition of the form \"revBloss\"", "a form that nobody has written down"},
+        {"<Spiral length='10' rot='cw' spiType='clothoid' radiusStart='INF'>" + ends + "</Spiral>", "radiusEnd",
+         "a radius that is missing"},
+        {"<Spiral length='10' rot='cw' spiType='clothoid' radiusStart='INF' radiusEnd='0'>" + ends + "</Spiral>",
+         "radiusEnd", "a radius of 0"},
+        {"<Spiral length='10' rot='cw' spiType='clothoid' radiusStart='INF' radiusEnd='INF'>" + ends + "</Spiral>",
+         "radiusStart", "no radius at all"},
+        {"<Spiral length='10' spiType='clothoid' radiusStart='INF' radiusEnd='50'>" + ends + "</Spiral>", "rot",
+         "no side"},
+        {"<Spiral rot='cw' spiType='clothoid' radiusStart='INF' radiusEnd='50'>" + ends + "</Spiral>", "length",
+         "no length"},
+        {"<Spiral length='1e9' rot='cw' spiType='clothoid' radiusStart='INF' radiusEnd='0.001'>" + ends + "</Spiral>",
+         "winds round", "a coil"},
+        {"<Spiral length='10' rot='cw' spiType='cubicParabola' radiusStart='10' radiusEnd='5'>" + ends + "</Spiral>",
+         "curved at both ends", "a form that begins at a tangent"},
+        {"<Spiral length='100' rot='cw' spiType='cubicParabola' radiusStart='INF' radiusEnd='5'>" + ends + "</Spiral>",
+         "45 degrees", "a form that stands over its tangent"},
+        {"<Curve rot='cw'>" + ends + "</Curve>", "Center", "no centre and no radius"},
+        {"<Curve rot='cw' radius='2'>" + ends + "</Curve>", "does not reach", "a radius that is too short"},
+        {"<Curve radius='20'>" + ends + "</Curve>", "rot", "no side"},
+        {"<Line length='3'><Start>0 0</Start></Line>", "End", "no end"},
+        {"<Line length='3'><End>0 0</End></Line>", "Start", "no start"},
+        {"<Line length='3'><Start pntRef='x'/><End>0 0</End></Line>", "\"x\" is not in the file",
+         "a point that is missing"},
+    };
+    for (const Row &row : rows) {
+        const QByteArray content = fileOf(alignment(row.element));
+        LandXmlFile file(content, queryOf(Kind::Elements), {QStringLiteral("Element"), QStringLiteral("StartBearing")});
+        EXPECT_EQ(file.rows(), QStringList(u"1|-"_qs)) << row.reason;
+        EXPECT_FALSE(file.list->error()) << row.reason;
+        ASSERT_GE(file.notes().size(), 1) << row.reason;
+        EXPECT_TRUE(file.notes().front().startsWith(u"5:") &&
+                    file.notes().front().contains(QString::fromLatin1(row.contains)))
+            << row.reason << ": " << file.notes().front().toStdString();
+
+        LandXmlQuery stations = queryOf(Kind::Stations);
+        LandXmlFile places(content, stations);
+        EXPECT_EQ(places.rows(), QStringList()) << row.reason << ": no place is guessed";
+        EXPECT_TRUE(textOfError(places.list->error()).contains(QString::fromLatin1(row.contains))) << row.reason;
+        EXPECT_TRUE(placeText(places.list->error()).startsWith(u"5:")) << row.reason;
+    }
+}
+
+TEST(LandXmlElements, TheirPointsMayBeReferred)
+{
+    LandXmlFile file(fileOf(alignment("<Line><Start pntRef='a'/><End pntRef='b'/></Line>") +
+                            "<CgPoints><CgPoint name='a'>1 2</CgPoint><CgPoint name='b'>1 7</CgPoint></CgPoints>"),
+                     queryOf(Kind::Elements), {QStringLiteral("StartNorthing"), QStringLiteral("EndEasting")});
+    EXPECT_EQ(file.rows(0), QStringList(u"1|7"_qs)) << "points that stand after the alignment";
+}
+
+TEST(LandXmlElements, AttributesThatAreNoNumbersAreErrors)
+{
+    for (const char *attribute : {"length='1,5'", "staStart='x'", "dir='1.2.3'", "length='nan'"}) {
+        LandXmlFile file(
+            fileOf(alignment(QByteArray("<Line ") + attribute + "><Start>0 0</Start><End>10 0</End></Line>")),
+            queryOf(Kind::Elements));
+        EXPECT_EQ(file.rows(), QStringList()) << attribute;
+        ASSERT_TRUE(file.list->error()) << attribute;
+        EXPECT_EQ(placeText(file.list->error()), u"5:1"_qs) << attribute;
+    }
+}
+
+TEST(LandXmlElements, OfOneAlignmentAreListedAlone)
+{
+    const QByteArray content =
+        fileOf(alignment(bend()) + alignment("<Line><Start>0 0</Start><End>1 0</End></Line>", "name='lane'"));
+    EXPECT_EQ(LandXmlFile(content, queryOf(Kind::Elements, "lane")).rows().size(), 1);
+    EXPECT_EQ(LandXmlFile(content, queryOf(Kind::Elements)).rows().size(), 4);
+    LandXmlFile all(content, queryOf(Kind::Alignments),
+                    {QStringLiteral("Alignment"), QStringLiteral("Length"), QStringLiteral("Elements"),
+                     QStringLiteral("EndEasting")});
+    EXPECT_EQ(all.rows(2), QStringList({u"road|307.08|3|650.00"_qs, u"lane|1.00|1|0.00"_qs}));
+}
+
+} // namespace

@@ -1,0 +1,129 @@
+#include "LandXmlFile.h"
+#include "LandXmlRoad.h"
+#include "RandomRuns.h"
+#include "RandomSequence.h"
+
+#include <gtest/gtest.h>
+
+namespace
+{
+
+using namespace kareport;
+using namespace landxml;
+using Kind = LandXmlListKind;
+
+constexpr Kind allKinds[] = {Kind::Points,   Kind::SurfacePoints, Kind::Parcels, Kind::Courses,       Kind::Alignments,
+                             Kind::Elements, Kind::Stations,      Kind::Profile, Kind::CrossSections, Kind::OffsetsOf};
+
+/// A file with something of everything that is read.
+QByteArray wholeFile()
+{
+    const PlaneCurve in = curve(TransitionForm::Clothoid, {1200, 650}, std::numbers::pi / 2, 60, 0, -1 / 200.0);
+    return fileOf(
+        "<CgPoints name='g'><CgPoint name='p1'>1030 504 11</CgPoint><CgPoint name='p2' pntRef='p1'/></CgPoints>"
+        "<Surfaces><Surface name='s'><Definition><Pnts><P id='1'>1 2 3</P></Pnts></Definition></Surface></Surfaces>" +
+        alignment(bend() + spiral(in, "clothoid"), "name='road' staStart='0'",
+                  "<StaEquation staInternal='30' staBack='30' staAhead='50'/>",
+                  "<Profile><ProfAlign name='d'><PVI>0 10</PVI><ParaCurve length='40'>100 12</ParaCurve><PVI>300 "
+                  "9</PVI></ProfAlign><ProfSurf name='s'><PntList2D>0 10 100 -3</PntList2D></ProfSurf></Profile>"
+                  "<CrossSects><CrossSect sta='50'><CrossSectSurf><PntList2D>-5 10 5 11</PntList2D></CrossSectSurf>"
+                  "</CrossSect></CrossSects>") +
+        "<Parcels><Parcel name='1' area='9'><CoordGeom><Line><Start>0 0</Start><End>1 0</End></Line></CoordGeom>"
+        "</Parcel></Parcels><Roadways/>");
+}
+
+/// Reads all lists of a file, twice. @return how many end without an error
+int readAll(const QByteArray &content)
+{
+    int sound = 0;
+    for (const Kind kind : allKinds) {
+        LandXmlQuery query = queryOf(kind);
+        query.interval = 50;
+        query.offsets = {{-5, -2.5}, {5, std::nullopt}};
+        LandXmlFile file(content, query);
+        const QStringList rows = file.rows();
+        const bool hasError = file.list->error().has_value();
+        sound += hasError ? 0 : 1;
+        if (hasError) {
+            EXPECT_FALSE(file.list->error()->text.isEmpty());
+            EXPECT_EQ(file.list->error()->file, file.path());
+        } else if (!rows.isEmpty()) {
+            EXPECT_EQ(file.row(0), rows.front()) << "read again";
+            file.list->Sort({1});
+            EXPECT_EQ(file.rows().size(), rows.size());
+        }
+        file.notes();
+    }
+    return sound;
+}
+
+TEST(LandXmlHostile, TheWholeFileIsSound)
+{
+    EXPECT_EQ(readAll(wholeFile()), int(std::size(allKinds)));
+}
+
+TEST(LandXmlHostile, CutOffAnywhereNothingIsTakenForWhole)
+{
+    const QByteArray whole = wholeFile();
+    for (qsizetype length = 0; length < whole.lastIndexOf('>'); length += 13) {
+        EXPECT_EQ(readAll(whole.first(length)), 0) << length;
+    }
+}
+
+TEST(LandXmlHostile, ChangedAnywhereItIsReadOrRefused)
+{
+    RandomRuns runs("changed files", 1, 150);
+    const QByteArray whole = wholeFile();
+    constexpr const char *pieces[] = {"0", "-",    "1e308", "INF",       "'",  "<",          "</",
+                                      "&", "\xFF", ",",     "999999999", "cw", "pntRef='p2'"};
+    while (runs.next()) {
+        RandomNumbers random(runs.seed());
+        QByteArray changed = whole;
+        for (int i = random.below(4); i >= 0; --i) {
+            const int at = random.below(int(changed.size()));
+            switch (random.below(3)) {
+            case 0: changed.remove(at, random.below(30)); break;
+            case 1: changed.insert(at, pieces[random.below(std::size(pieces))]); break;
+            default: changed.insert(at, changed.mid(random.below(int(changed.size())), random.below(200))); break;
+            }
+        }
+        readAll(changed);
+    }
+}
+
+TEST(LandXmlHostile, ElementsThatWindRoundWithoutEndAreRefused)
+{
+    QByteArray elements;
+    for (int i = 0; i < 200; ++i) {
+        elements +=
+            "<Spiral length='60000' rot='cw' spiType='clothoid' radiusStart='INF' radiusEnd='1'><Start>0 0</Start>"
+            "<End>1 1</End></Spiral>";
+    }
+    for (const Kind kind : {Kind::Elements, Kind::Stations}) {
+        LandXmlFile file(fileOf(alignment(elements)), queryOf(kind));
+        EXPECT_EQ(file.rows(), QStringList());
+        ASSERT_TRUE(file.list->error());
+        EXPECT_TRUE(file.list->error()->text.contains(u"wind round too often"));
+    }
+    LandXmlFile parcels(fileOf("<Parcels><Parcel><CoordGeom>" + elements + "</CoordGeom></Parcel></Parcels>"),
+                        queryOf(Kind::Parcels));
+    EXPECT_EQ(parcels.rows(), QStringList());
+    EXPECT_TRUE(parcels.list->error());
+}
+
+TEST(LandXmlHostile, NotesAreBounded)
+{
+    const QByteArray line = "<Line length='9'><Start>0 0</Start><End>1 0</End></Line>";
+    QByteArray kinds;
+    for (int i = 0; i < 1000; ++i) {
+        kinds += "<K" + QByteArray::number(i) + "/>";
+    }
+    LandXmlFile file(fileOf(alignment(line.repeated(1000)) + kinds), queryOf(Kind::Elements));
+    file.rows();
+    const QStringList notes = file.notes();
+    EXPECT_EQ(notes.size(), 202);
+    EXPECT_TRUE(notes.contains(u"elements of other kinds: 900 in the file, which no list reads"_qs));
+    EXPECT_TRUE(notes[100].startsWith(u"and "));
+}
+
+} // namespace
