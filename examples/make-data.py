@@ -1,5 +1,6 @@
 #!/usr/bin/env python3
-"""Computes the survey data that the sample jobs show, and writes it as CSV into the folder data beside this file.
+"""Computes the survey data that the sample jobs show, and writes it into the folder data beside this file: as CSV, and
+one road as LandXML.
 
 Everything is worked out from a few design values, so the figures of a report agree with each other: the legs of the
 traverse with its coordinates, the points set out with the alignment, cut and fill with the two elevations. Running it
@@ -369,6 +370,149 @@ def write_control(road):
           rows[2 * third:] + rows[:third] + rows[third:2 * third])
 
 
+# ------------------------------------------------------------------------------------- the road as a designer's file
+
+def beside(road, station, offset):
+    """Northing and easting of a point beside the road, offset to the right."""
+    north, east, bearing = road.at(station)
+    return north - offset * math.sin(bearing), east + offset * math.cos(bearing)
+
+
+def pair(north, east):
+    return f"{fixed(north, 4)} {fixed(east, 4)}"
+
+
+def horizontal(elements):
+    """The elements as they are stored: points in full digits, lengths and radii as designed."""
+    lines = []
+    for e in elements:
+        end_north, end_east, end_bearing = e.at(e.length)
+        start = f'<Start name="{e.first}">{pair(e.north, e.east)}</Start>'
+        end = f'<End name="{e.last}">{pair(end_north, end_east)}</End>'
+        turn = 'rot="cw"' if e.turn == "R" else 'rot="ccw"'
+        measures = f'length="{fixed(e.length, 4)}"'
+        if e.kind == "Line":
+            lines.append(f'<Line {measures} dir="{fixed(math.degrees(e.bearing) % 360.0, 8)}">{start}{end}</Line>')
+        elif e.kind == "Curve":
+            north = e.north - math.sin(e.bearing) / e.k0
+            east = e.east + math.cos(e.bearing) / e.k0
+            lines.append(f'<Curve {turn} crvType="arc" {measures} radius="{radius_of(e.k0)}">{start}'
+                         f"<Center>{pair(north, east)}</Center>{end}</Curve>")
+        else:
+            # The tangents of both ends meet where the way along the first one has the same offset from the second.
+            sine = math.sin(end_bearing - e.bearing)
+            along = ((end_east - e.east) * -math.cos(end_bearing) + (end_north - e.north) * math.sin(end_bearing)) / sine
+            north, east = e.north + along * math.cos(e.bearing), e.east + along * math.sin(e.bearing)
+            lines.append(f'<Spiral {turn} spiType="clothoid" {measures} radiusStart="{radius_of(e.k0)}" '
+                         f'radiusEnd="{radius_of(e.k1)}">{start}<PI>{pair(north, east)}</PI>{end}</Spiral>')
+    return lines
+
+
+def vertical(road, profile):
+    lines = ["<Profile>", '\t<ProfAlign name="design">']
+    for station, height, length in profile.points:
+        point = f"{fixed(station, 3)} {fixed(height, 3)}"
+        lines.append(f'\t\t<ParaCurve length="{fixed(length, 3)}">{point}</ParaCurve>' if length
+                     else f"\t\t<PVI>{point}</PVI>")
+    heights = [f"{at} {fixed(ground(*road.at(at)[:2]), 3)}" for at in [-75] + list(range(-60, 1541, 20))]
+    return lines + ["\t</ProfAlign>", f'\t<ProfSurf name="ground"><PntList2D>{" ".join(heights)}</PntList2D></ProfSurf>',
+                    "</Profile>"]
+
+
+def sections(road, profile):
+    lines = ["<CrossSects>"]
+    for at in range(0, 201, 50):
+        middle, edge = profile.elevation(at), right_edge(at)
+        heights = [f"{offset} {fixed(ground(*beside(road, at, offset)), 3)}" for offset in range(-12, 13, 4)]
+        lines.append(f'\t<CrossSect sta="{at}" name="{grouped(at)}">')
+        lines.append(f'\t\t<CrossSectSurf name="ground"><PntList2D>{" ".join(heights)}</PntList2D></CrossSectSurf>')
+        for side, sign, width in (("left", -1.0, VERGE), ("right", 1.0, edge)):
+            paved = CARRIAGEWAY + (width - VERGE)
+            points = "".join(
+                f'<CrossSectPnt code="{code}">{fixed(sign * offset, 3)} {fixed(middle - fall(offset, width), 3)}</CrossSectPnt>'
+                for code, offset in (("CL", 0.0), ("EP", paved), ("VERGE", width)))
+            lines.append(f'\t\t<DesignCrossSectSurf name="road" side="{side}" material="asphalt" '
+                         f'typicalWidth="{fixed(width, 3)}">{points}</DesignCrossSectSurf>')
+        lines.append("\t</CrossSect>")
+    return lines + ["</CrossSects>"]
+
+
+def points(road, profile):
+    """Points to set out from, and points that were surveyed when the road was made."""
+    chance = random.Random(17)
+    lines = ['<CgPoints name="control">']
+    for number, (station, offset, kind) in enumerate(
+            ((-60.0, -18.0, "pillar"), (240.0, 22.5, "brass bolt"), (590.0, -31.0, "nail"), (1010.0, 27.0, "pillar")), 1):
+        north, east = beside(road, station, offset)
+        lines.append(f'\t<CgPoint name="GP{number}" code="CTRL" desc="{kind}">{pair(north, east)} '
+                     f"{fixed(ground(north, east), 4)}</CgPoint>")
+    lines += ["</CgPoints>", '<CgPoints name="as-built">']
+    for i in range(18):
+        code, offset = (("EPL", -CARRIAGEWAY), ("CL", 0.0), ("EPR", CARRIAGEWAY))[i % 3]
+        station = 20.0 * (i // 3) + 0.3 * (chance.random() - 0.5)
+        offset += 0.02 * (chance.random() - 0.5)
+        height = profile.elevation(station) - fall(offset, VERGE) + 0.03 * (chance.random() - 0.5)
+        lines.append(f'\t<CgPoint name="{i + 1}" code="{code}">{pair(*beside(road, station, offset))} {fixed(height, 3)}</CgPoint>')
+    return lines + ["</CgPoints>"]
+
+
+def terrain(road):
+    lines = ['<Surfaces><Surface name="ground"><Definition surfType="TIN"><Pnts>']
+    number = 0
+    for station in range(0, 201, 25):
+        for offset in (-25.0, 0.0, 25.0):
+            north, east = beside(road, station, offset)
+            number += 1
+            lines.append(f'\t<P id="{number}">{pair(north, east)} {fixed(ground(north, east), 3)}</P>')
+    return lines + ["</Pnts></Definition></Surface></Surfaces>"]
+
+
+def parcels(road):
+    """Lots on the left of the road's first curve, whose border follows the road at 12 m."""
+    curve = next(e for e in road.elements if e.kind == "Curve")
+    centre_north = curve.north - math.sin(curve.bearing) / curve.k0
+    centre_east = curve.east + math.cos(curve.bearing) / curve.k0
+    lines = ["<Parcels>"]
+    for number in (1, 2):
+        first, last = curve.station + 30.0 * (number - 1), curve.station + 30.0 * number
+        near = [beside(road, station, -12.0) for station in (first, last)]
+        far = [beside(road, station, -52.0) for station in (last, first)]
+        # The two radii, the arc along the road and the chord at the back.
+        radius, turn = 1.0 / curve.k0 + 12.0, 30.0 * curve.k0
+        back = radius + 40.0
+        area = radius * radius * (turn - math.sin(turn)) / 2.0
+        corners = near + far
+        area += 0.5 * sum(corners[i][0] * corners[(i + 1) % 4][1] - corners[(i + 1) % 4][0] * corners[i][1] for i in range(4))
+        middle = beside(road, (first + last) / 2.0, -32.0)
+        sides = [f'<Curve rot="cw" radius="{fixed(radius, 4)}"><Start>{pair(*near[0])}</Start>'
+                 f"<Center>{pair(centre_north, centre_east)}</Center><End>{pair(*near[1])}</End></Curve>"]
+        for start, end in ((near[1], far[0]), (far[0], far[1]), (far[1], near[0])):
+            sides.append(f"<Line><Start>{pair(*start)}</Start><End>{pair(*end)}</End></Line>")
+        assert abs(math.dist(*far) - 2.0 * back * math.sin(turn / 2.0)) < 1e-6
+        lines.append(f'\t<Parcel name="{number}" desc="Curve lot {number}" area="{fixed(abs(area), 2)}">'
+                     f"<Center>{pair(*middle)}</Center><CoordGeom>")
+        lines += ["\t\t" + side for side in sides] + ["\t</CoordGeom></Parcel>"]
+    return lines + ["</Parcels>"]
+
+
+def write_road(road, profile):
+    """The elements of the road up to its third curve. At station 700 the count breaks off and goes on with 1000."""
+    elements = [e for e in road.elements if e.station < 1540.0]
+    length = elements[-1].station + elements[-1].length - road.start
+    inner = [f'<StaEquation staInternal="700" staBack="700" staAhead="1000"/>', "<CoordGeom>"]
+    inner += ["\t" + line for line in horizontal(elements)] + ["</CoordGeom>"]
+    inner += vertical(road, profile) + sections(road, profile)
+    lines = ['<?xml version="1.0" encoding="UTF-8"?>',
+             '<LandXML xmlns="http://www.landxml.org/schema/LandXML-1.2" version="1.2" date="2024-03-05" time="14:07:00">',
+             '<Units><Metric linearUnit="meter" areaUnit="squareMeter" volumeUnit="cubicMeter" temperatureUnit="celsius" '
+             'pressureUnit="HPA" angularUnit="decimal degrees" directionUnit="decimal degrees"/></Units>',
+             '<Project name="Kestrel Bay Relief Road"/>', *points(road, profile), *terrain(road),
+             f'<Alignments><Alignment name="RR-1" desc="Kestrel Bay Relief Road" length="{fixed(length, 4)}" '
+             f'staStart="{fixed(road.start, 3)}">', *["\t" + line for line in inner], "</Alignment></Alignments>",
+             *parcels(road), "</LandXML>"]
+    (DATA / "road.xml").write_text("\n".join(lines) + "\n", encoding="utf-8")
+
+
 def main():
     DATA.mkdir(exist_ok=True)
     road = make_alignment()
@@ -378,6 +522,7 @@ def main():
     write_layers(road, profile)
     write_traverse()
     write_control(road)
+    write_road(road, profile)
 
 
 if __name__ == "__main__":

@@ -1002,6 +1002,11 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>not supported: an element "%1" of an alignment or a border</source>
+        <translation>nicht unterstützt: ein Element „%1“ einer Achse oder einer Grenze</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
         <source>the element has no geometry: its radius does not reach from its start to its end</source>
         <translation>das Element hat keine Geometrie: sein Halbmesser reicht nicht vom Anfang zum Ende</translation>
     </message>
@@ -1056,6 +1061,16 @@
         <translation>der Wert der Variablen „%1“ passt nicht: %2 wurde erwartet</translation>
     </message>
     <message>
+        <location filename="../sources/landxml/LandXmlNames.cpp"/>
+        <source>"%1" is not in the file, which has no names for it</source>
+        <translation>„%1“ ist nicht in der Datei, die dafür keine Namen hat</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlNames.cpp"/>
+        <source>"%1" is not in the file: one of %2 was expected</source>
+        <translation>„%1“ ist nicht in der Datei: erwartet wurde eines von %2</translation>
+    </message>
+    <message>
         <location filename="../sources/landxml/LandXmlNotes.cpp"/>
         <source>and %1 more such differences</source>
         <translation>und %1 weitere solche Abweichungen</translation>
@@ -1074,6 +1089,11 @@
         <location filename="../sources/landxml/LandXmlReader.cpp"/>
         <source>the element holds more than %1 bytes of text</source>
         <translation>das Element enthält mehr als %1 Byte Text</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReaderAttributes.cpp"/>
+        <source>not supported: coordinates of a cross section that lies at a skew to its alignment</source>
+        <translation>nicht unterstützt: Koordinaten eines Querprofils, das schräg zu seiner Achse liegt</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlReaderAttributes.cpp"/>
@@ -1136,6 +1156,11 @@
         <translation>die Datei ist von Version %1: gelesen werden die Versionen 1.0 bis 2.0</translation>
     </message>
     <message>
+        <location filename="../sources/landxml/LandXmlRows.cpp"/>
+        <source>elevationUnit is "%1": heights are taken to be in the unit of lengths</source>
+        <translation>elevationUnit ist „%1“: Höhen werden in der Längeneinheit angenommen</translation>
+    </message>
+    <message>
         <location filename="../sources/landxml/LandXmlUnits.cpp"/>
         <source>the file has no units: Metric or Imperial in Units was expected</source>
         <translation>die Datei hat keine Einheiten: Metric oder Imperial in Units wurde erwartet</translation>
@@ -1167,8 +1192,8 @@
     </message>
     <message>
         <location filename="../sources/landxml/PointRows.cpp"/>
-        <source>the alignment "%1" is not in the file</source>
-        <translation>die Achse „%1“ ist nicht in der Datei</translation>
+        <source>the file has no alignment</source>
+        <translation>die Datei hat keine Achse</translation>
     </message>
     <message>
         <location filename="../sources/landxml/PointRows.cpp"/>

@@ -1002,6 +1002,11 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <source>not supported: an element "%1" of an alignment or a border</source>
+        <translation>未対応：線形または境界の要素「%1」</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
         <source>the element has no geometry: its radius does not reach from its start to its end</source>
         <translation>要素の形状を求められません: 半径が始点から終点まで届きません</translation>
     </message>
@@ -1056,6 +1061,16 @@
         <translation>変数「%1」の値が合いません: %2 が必要です</translation>
     </message>
     <message>
+        <location filename="../sources/landxml/LandXmlNames.cpp"/>
+        <source>"%1" is not in the file, which has no names for it</source>
+        <translation>「%1」はファイルにありません。ファイルにはこれに当たる名前がありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlNames.cpp"/>
+        <source>"%1" is not in the file: one of %2 was expected</source>
+        <translation>「%1」はファイルにありません：%2 のいずれかが必要です</translation>
+    </message>
+    <message>
         <location filename="../sources/landxml/LandXmlNotes.cpp"/>
         <source>and %1 more such differences</source>
         <translation>ほかに同様の相違が %1 件あります</translation>
@@ -1074,6 +1089,11 @@
         <location filename="../sources/landxml/LandXmlReader.cpp"/>
         <source>the element holds more than %1 bytes of text</source>
         <translation>要素のテキストが %1 バイトを超えています</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReaderAttributes.cpp"/>
+        <source>not supported: coordinates of a cross section that lies at a skew to its alignment</source>
+        <translation>未対応：線形に対して斜めの横断面の座標</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlReaderAttributes.cpp"/>
@@ -1136,6 +1156,11 @@
         <translation>ファイルはバージョン %1 です: 読み取れるのはバージョン 1.0 から 2.0 です</translation>
     </message>
     <message>
+        <location filename="../sources/landxml/LandXmlRows.cpp"/>
+        <source>elevationUnit is "%1": heights are taken to be in the unit of lengths</source>
+        <translation>elevationUnit は「%1」です：高さは長さの単位とみなします</translation>
+    </message>
+    <message>
         <location filename="../sources/landxml/LandXmlUnits.cpp"/>
         <source>the file has no units: Metric or Imperial in Units was expected</source>
         <translation>ファイルに単位がありません: Units の中に Metric または Imperial が必要です</translation>
@@ -1167,8 +1192,8 @@
     </message>
     <message>
         <location filename="../sources/landxml/PointRows.cpp"/>
-        <source>the alignment "%1" is not in the file</source>
-        <translation>線形「%1」がファイルにありません</translation>
+        <source>the file has no alignment</source>
+        <translation>ファイルに線形がありません</translation>
     </message>
     <message>
         <location filename="../sources/landxml/PointRows.cpp"/>

@@ -58,13 +58,20 @@ struct AlignmentRows::Variables
     {
         return rows.route_->fault ? std::nullopt : rows.route_->alignment.at(distance);
     }
+    static LandXmlValue length(const Rows &rows)
+    {
+        return rows.route_->isLengthKnown ? valueOf(rows.route_->length) : LandXmlValue();
+    }
     static constexpr LandXmlGetter<Rows> getters[] = {
         {"Alignment", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.route_->stored->name); }},
         {"Description", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.route_->stored->description); }},
-        {"Length", VARIABLE_LENGTH, [](const Rows &rows) { return valueOf(rows.route_->length); }},
+        {"Length", VARIABLE_LENGTH, [](const Rows &rows) { return length(rows); }},
         {"StartStation", VARIABLE_STATION, [](const Rows &rows) { return valueOf(rows.route_->nameOf(0).station); }},
         {"EndStation", VARIABLE_STATION,
-         [](const Rows &rows) { return valueOf(rows.route_->nameOf(rows.route_->length, true).station); }},
+         [](const Rows &rows) {
+             return rows.route_->isLengthKnown ? valueOf(rows.route_->nameOf(rows.route_->length, true).station)
+                                               : LandXmlValue();
+         }},
         {"Elements", VARIABLE_INTEGER, [](const Rows &rows) { return count(rows.route_->stored->elements.size()); }},
         {"Equations", VARIABLE_INTEGER, [](const Rows &rows) { return count(rows.route_->stored->equations.size()); }},
         {"GradeLines", VARIABLE_INTEGER,
@@ -98,7 +105,7 @@ bool AlignmentRows::load()
         }
     }
     count_ = rows_.size();
-    return true;
+    return expectNames();
 }
 
 struct ElementRows::Variables
@@ -108,19 +115,28 @@ struct ElementRows::Variables
     {
         using Kind = LandXmlElement::Kind;
         const Kind kind = rows.element_->kind;
-        return kind == Kind::Spiral ? stored : kind == Kind::Curve ? arcRadius(rows) : infinite;
+        switch (kind) {
+        case Kind::Spiral: return stored;
+        case Kind::Curve: return arcRadius(rows);
+        case Kind::Other: return notGiven;
+        default: return infinite;
+        }
     }
     static double arcRadius(const Rows &rows)
     {
         return rows.start_ ? radiusOf(rows.start_->curvature) : rows.element_->radius;
     }
-    static const char *typeOf(LandXmlElement::Kind kind)
+    static LandXmlValue typeOf(const LandXmlElement &element)
     {
         using Kind = LandXmlElement::Kind;
-        return kind == Kind::Line            ? "Line"
-               : kind == Kind::IrregularLine ? "IrregularLine"
-               : kind == Kind::Curve         ? "Curve"
-                                             : "Spiral";
+        switch (element.kind) {
+        case Kind::Line: return "Line";
+        case Kind::IrregularLine: return "IrregularLine";
+        case Kind::Curve: return "Curve";
+        case Kind::Spiral: return "Spiral";
+        case Kind::Other: break;
+        }
+        return valueOf(element.form);
     }
     /// Of a clothoid, the root of its length over its change of curvature.
     static LandXmlValue parameter(const Rows &rows)
@@ -145,16 +161,25 @@ struct ElementRows::Variables
         {"Alignment", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.route_->stored->name); }},
         {"Element", VARIABLE_INTEGER, [](const Rows &rows) { return count(rows.piece_->element + 1); }},
         {"Name", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.element_->name); }},
-        {"Type", VARIABLE_TEXT, [](const Rows &rows) { return LandXmlValue(typeOf(rows.element_->kind)); }},
-        {"Form", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.element_->form); }},
+        {"Type", VARIABLE_TEXT, [](const Rows &rows) { return typeOf(*rows.element_); }},
+        {"Form", VARIABLE_TEXT,
+         [](const Rows &rows) {
+             return rows.element_->kind == LandXmlElement::Kind::Spiral ? valueOf(rows.element_->form) : LandXmlValue();
+         }},
         {"Rotation", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.element_->rotation); }},
         {"StartStation", VARIABLE_STATION,
-         [](const Rows &rows) { return valueOf(rows.route_->nameOf(rows.piece_->start).station); }},
+         [](const Rows &rows) {
+             return rows.piece_->isPlaced ? valueOf(rows.route_->nameOf(rows.piece_->start).station) : LandXmlValue();
+         }},
         {"EndStation", VARIABLE_STATION,
          [](const Rows &rows) {
-             return valueOf(rows.route_->nameOf(rows.piece_->start + rows.piece_->length, true).station);
+             const LandXmlRoute::Piece &piece = *rows.piece_;
+             return piece.isPlaced && piece.length > 0
+                        ? valueOf(rows.route_->nameOf(piece.start + piece.length, true).station)
+                        : LandXmlValue();
          }},
-        {"Length", VARIABLE_LENGTH, [](const Rows &rows) { return valueOf(rows.piece_->length); }},
+        {"Length", VARIABLE_LENGTH,
+         [](const Rows &rows) { return rows.piece_->length > 0 ? valueOf(rows.piece_->length) : LandXmlValue(); }},
         {"Radius", VARIABLE_LENGTH,
          [](const Rows &rows) {
              return rows.element_->kind == LandXmlElement::Kind::Spiral ? LandXmlValue() : valueOf(radius(rows, 0));
@@ -196,12 +221,13 @@ bool ElementRows::load()
         return false;
     }
     for (const LandXmlRoute &route : model_.routes) {
-        for (std::size_t i = 0; isNamed(route.stored->name) && i < route.pieces.size(); ++i) {
+        const std::size_t pieces = isNamed(route.stored->name) ? route.pieces.size() : 0;
+        for (std::size_t i = 0; i < pieces; ++i) {
             rows_.emplace_back(&route, i);
         }
     }
     count_ = rows_.size();
-    return true;
+    return expectNames();
 }
 
 void ElementRows::take(std::size_t index)
@@ -311,18 +337,24 @@ bool ProfileRows::load()
     if (!readAlignments(model_, {})) {
         return false;
     }
-    const std::string wanted = source_.query.gradeLine.toStdString();
     for (const LandXmlRoute &route : model_.routes) {
-        const auto &lines = route.stored->gradeLines;
-        for (std::size_t line = 0; isNamed(route.stored->name) && line < lines.size(); ++line) {
-            for (std::size_t i = 0; (wanted.empty() || lines[line].name == wanted) && i < lines[line].points.size();
-                 ++i) {
-                rows_.push_back({&route, line, i});
-            }
+        if (isNamed(route.stored->name)) {
+            addGradeLines(route);
         }
     }
     count_ = rows_.size();
-    return true;
+    return expectNames();
+}
+
+void ProfileRows::addGradeLines(const LandXmlRoute &route)
+{
+    const auto &lines = route.stored->gradeLines;
+    for (std::size_t line = 0; line < lines.size(); ++line) {
+        const std::size_t points = gradeLines_.matches(lines[line].name) ? lines[line].points.size() : 0;
+        for (std::size_t i = 0; i < points; ++i) {
+            rows_.push_back({&route, line, i});
+        }
+    }
 }
 
 double ProfileRows::stationOf(double internal) const

@@ -79,6 +79,7 @@ private:
         std::size_t point;
     };
 
+    void addGradeLines(const LandXmlRoute &route);
     double stationOf(double internal) const;
     std::optional<double> heightAt(double internal) const;
 

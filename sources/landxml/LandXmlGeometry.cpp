@@ -94,6 +94,11 @@ std::variant<PlanePoint, LandXmlFault> LandXmlGeometry::positionOf(const LandXml
 
 LandXmlCurves LandXmlGeometry::curvesOf(const LandXmlElement &element) const
 {
+    if (element.kind == LandXmlElement::Kind::Other) {
+        return LandXmlFault{
+            Xlate("not supported: an element \"%1\" of an alignment or a border").arg(utf8(element.form)),
+            element.byte};
+    }
     if (!element.start.isGiven() || !element.end.isGiven()) {
         return LandXmlFault{missing(element.start.isGiven() ? "End" : "Start"), element.byte};
     }
@@ -111,6 +116,7 @@ LandXmlCurves LandXmlGeometry::curvesOf(const LandXmlElement &element) const
     case LandXmlElement::Kind::IrregularLine: return irregularLineOf(element, ends);
     case LandXmlElement::Kind::Curve: curves = curveOf(element, ends); break;
     case LandXmlElement::Kind::Spiral: curves = spiralOf(element, ends); break;
+    case LandXmlElement::Kind::Other: break; // it has no ends
     }
     if (const auto *made = std::get_if<std::vector<PlaneCurve>>(&curves)) {
         compareWithStated(element, ends, made->front());

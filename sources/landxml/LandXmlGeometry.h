@@ -10,6 +10,7 @@
 
 #include <QString>
 
+#include <numbers>
 #include <optional>
 #include <variant>
 #include <vector>

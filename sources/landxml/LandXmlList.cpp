@@ -9,6 +9,24 @@
 namespace kareport
 {
 
+namespace
+{
+
+/// Brings the lengths of a query into metres. @param unit  metres in their unit
+void scale(LandXmlQuery &query, double unit)
+{
+    query.unit = 1.0;
+    query.interval *= unit;
+    for (double &station : query.stations) {
+        station *= unit;
+    }
+    for (LandXmlOffset &line : query.offsets) {
+        line.offset *= unit;
+    }
+}
+
+} // namespace
+
 LandXmlList::LandXmlList(std::shared_ptr<const FileBytes> file, LandXmlQuery query, const FindVariable &findVariable,
                          ReadProgress progress)
     : file_(std::move(file)), progress_(std::move(progress))
@@ -18,7 +36,9 @@ LandXmlList::LandXmlList(std::shared_ptr<const FileBytes> file, LandXmlQuery que
         error_ = endOfRows(*error);
         return;
     }
-    rows_ = LandXmlRows::make({file_, std::get<LandXmlHeader>(header), std::move(query), progress_});
+    const double unit = query.unit.value_or(std::get<LandXmlHeader>(header).units.metres);
+    scale(query, unit);
+    rows_ = LandXmlRows::make({file_, std::get<LandXmlHeader>(header), std::move(query), progress_, unit});
     bind(findVariable);
 }
 
@@ -189,7 +209,9 @@ void LandXmlList::Sort(const std::vector<unsigned> &ids)
 
 std::vector<InputError> LandXmlList::notes() const
 {
-    return rows_ ? rows_->notes() : std::vector<InputError>();
+    // Until then another thread adds to them.
+    const bool isComplete = batch_ != nullptr && batch_->isLast;
+    return isComplete ? rows_->notes() : std::vector<InputError>();
 }
 
 } // namespace kareport

@@ -37,7 +37,7 @@ public:
 
     std::optional<InputError> error() const override { return error_; }
     /// What there is to say of a file whose rows are sound: what differs, and the kinds of elements that no list reads.
-    /// Complete when the rows have come to their end.
+    /// Nothing before the rows have come to their end.
     std::vector<InputError> notes() const;
 
 private:

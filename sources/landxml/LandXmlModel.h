@@ -49,12 +49,13 @@ struct LandXmlElement
         Line,
         IrregularLine,
         Curve,
-        Spiral
+        Spiral,
+        Other ///< has no geometry here, and its place in the alignment is not passed over
     };
 
     Kind kind = Kind::Line;
     std::string name;
-    std::string form;     ///< of a spiral
+    std::string form;     ///< of a spiral; of another kind, the name of the element
     std::string rotation; ///< "cw", "ccw" or nothing
     double length = notGiven;
     double radius = notGiven;
@@ -140,6 +141,7 @@ struct LandXmlSection
     double station = notGiven;
     double cutArea = notGiven;
     double fillArea = notGiven;
+    bool isSkew = false; ///< does not lie at a right angle to the alignment
     std::vector<LandXmlSectionSurface> surfaces;
     std::size_t byte = 0;
 };

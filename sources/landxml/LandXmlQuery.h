@@ -40,19 +40,26 @@ struct LandXmlOffset
                    ///< falls; without it the points have no height
 };
 
-/// Which rows a job wants of a file. Lengths are in metres.
+/// Which rows a job wants of a file. Lengths are in metres unless `unit` says otherwise.
 struct LandXmlQuery
 {
     LandXmlListKind kind = LandXmlListKind::Points;
     /// Only what belongs to this: a group of points, a surface, a parcel or an alignment; everything where it is empty. The
-    /// points of `OffsetsOf` are of this group.
+    /// points of `OffsetsOf` are of this group. A name here, or one of those below, that the file does not have is an error.
     QString name;
     LandXmlTolerance tolerance;
 
-    // Of stations and of projected points:
     QString alignment; ///< of `OffsetsOf`; may be empty when there is one alone
-    QString gradeLine; ///< its name; the alignment's first where it is empty
-    QString surface;   ///< along the alignment: its name; the first where it is empty
+    /// Of `Profile`: the grade lines of this name alone. Of `Stations` and `OffsetsOf`: the one of this name, or the
+    /// alignment's first where it is empty. Other lists must not ask for one.
+    QString gradeLine;
+    /// Of `CrossSections`: the surfaces of this name alone. Of `Stations`: the one of this name along the alignment, or the
+    /// first where it is empty. Other lists must not ask for one.
+    QString surface;
+
+    /// Metres in the unit of `interval`, `stations` and `offsets`; nothing for the unit of the file's lengths, which nobody
+    /// knows before the file is read.
+    std::optional<double> unit = 1.0;
 
     // Of stations:
     double interval = 0;          ///< none at 0

@@ -98,7 +98,9 @@ XmlHandler::Interest LandXmlReader::startElement(std::string_view name, const Xm
     }
     const Tag tag = tagOf(open_.back().tag, name);
     if (tag == Tag::None) {
-        if (open_.size() > 1 || !isHeader(name)) {
+        if (open_.back().tag == Tag::Geometry && name != "Feature") {
+            beginOther(name);
+        } else if (open_.size() > 1 || !isHeader(name)) {
             notes_.passOver(name);
         }
         return Interest::None;
@@ -120,6 +122,8 @@ void LandXmlReader::endElement()
     open_.pop_back();
     if (closed.isRead) {
         end(closed.tag);
+    } else if (closed.tag == Tag::Points || closed.tag == Tag::Surface) {
+        openOwners_.pop_back();
     } else if (closed.tag == Tag::Parcel) {
         --parcelDepth_;
         if (wants_.parcels) {
@@ -147,6 +151,7 @@ XmlHandler::Interest LandXmlReader::begin(Tag tag, const XmlAttributes &attribut
     switch (tag) {
     case Tag::Points:
     case Tag::Surface:
+        openOwners_.push_back(owners_.size());
         owners_.push_back(textOf(attributes, "name"));
         isSurface_.push_back(tag == Tag::Surface);
         return Interest::Parts;
@@ -160,8 +165,7 @@ XmlHandler::Interest LandXmlReader::begin(Tag tag, const XmlAttributes &attribut
     case Tag::Parcel: beginParcel(attributes); return Interest::Parts;
     default: break;
     }
-    const bool isWanted = parcelDepth_ > 0 ? wants_.parcels : wants_.alignments;
-    if (tag < Tag::Alignment || !isWanted) {
+    if (tag < Tag::Alignment || !isGeometryWanted()) {
         return Interest::Parts;
     }
     if (tag >= Tag::Profile && tag <= Tag::SurfaceLine) {

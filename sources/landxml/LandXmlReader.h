@@ -69,6 +69,8 @@ private:
     Interest beginInSections(Tag tag, const XmlAttributes &attributes);
     bool isListRead() const;
     void beginElement(Tag tag, const XmlAttributes &attributes);
+    void beginOther(std::string_view name);
+    bool isGeometryWanted() const { return parcelDepth_ > 0 ? wants_.parcels : wants_.alignments; }
     void beginPoint(Tag tag, const XmlAttributes &attributes);
     void beginEquation(const XmlAttributes &attributes);
     void beginGradePoint(Tag tag, const XmlAttributes &attributes);
@@ -109,6 +111,7 @@ private:
     std::size_t pointCount_ = 0;
     std::vector<std::string> owners_;
     std::vector<bool> isSurface_;         ///< of the owners
+    std::vector<std::size_t> openOwners_; ///< their indexes, the innermost last
     int parcelDepth_ = 0;                 ///< parcels that are open
     std::vector<std::size_t> parcelPath_; ///< their indexes, the innermost last, where they are wanted
 };

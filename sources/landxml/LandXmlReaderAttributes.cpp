@@ -29,7 +29,7 @@ void LandXmlReader::beginPoint(Tag tag, const XmlAttributes &attributes)
     }
     point.code = attributes.text("code");
     point.description = attributes.text("desc");
-    point.owner = owners_.size() - 1;
+    point.owner = openOwners_.back();
     startCoordinates(point.at, attributes);
 }
 
@@ -82,6 +82,19 @@ void LandXmlReader::beginElement(Tag tag, const XmlAttributes &attributes)
     element.delta = angle(attributes, "delta", units_.angle);
 }
 
+/// Keeps an element of a kind that has no geometry here: what comes after it stands farther along.
+void LandXmlReader::beginOther(std::string_view name)
+{
+    if (!isGeometryWanted()) {
+        return;
+    }
+    auto &elements = parcelPath_.empty() ? alignments.back().elements : parcels[parcelPath_.back()].elements;
+    LandXmlElement &element = elements.emplace_back();
+    element.byte = stream_.currentByte();
+    element.kind = LandXmlElement::Kind::Other;
+    element.form = name.substr(0, 100);
+}
+
 void LandXmlReader::beginEquation(const XmlAttributes &attributes)
 {
     LandXmlEquation &equation = alignments.back().equations.emplace_back();
@@ -114,7 +127,13 @@ void LandXmlReader::beginSection(const XmlAttributes &attributes)
     section.station = length(attributes, "sta");
     section.cutArea = number(attributes, "areaCut") * units_.squareMetres;
     section.fillArea = number(attributes, "areaFill") * units_.squareMetres;
+    const double skew = angle(attributes, "angleSkew", units_.angle);
     section.byte = stream_.currentByte();
+    if (std::fabs(skew) > 0) {
+        section.isSkew = true;
+        notes_.add(section.byte,
+                   Xlate("not supported: coordinates of a cross section that lies at a skew to its alignment"));
+    }
     if (std::isnan(section.station)) {
         stream_.fail(section.byte, Xlate("the attribute %1 was expected").arg(QStringLiteral("sta")));
     }

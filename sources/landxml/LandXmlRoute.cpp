@@ -28,7 +28,9 @@ public:
         for (std::size_t i = 0; i < stored_.elements.size(); ++i) {
             addElement(i, budget);
         }
-        geometry_.compareLength(stored_.byte, "length", stored_.length, route_.length);
+        if (route_.isLengthKnown) {
+            geometry_.compareLength(stored_.byte, "length", stored_.length, route_.length);
+        }
         addEquations();
         for (const LandXmlGradeLine &line : stored_.gradeLines) {
             route_.profiles.push_back(geometry_.profileOf(line));
@@ -68,7 +70,11 @@ private:
             notes_.add(fault->byte, fault->text);
             route_.fault = route_.fault ? route_.fault : *fault;
         }
-        geometry_.compareLength(element.byte, "staStart", element.staStart, stored_.staStart + route_.length);
+        piece.isPlaced = route_.isLengthKnown;
+        if (piece.isPlaced) {
+            geometry_.compareLength(element.byte, "staStart", element.staStart, stored_.staStart + route_.length);
+        }
+        route_.isLengthKnown = route_.isLengthKnown && piece.length > 0;
         addCurves(piece, length);
         route_.length += piece.length;
         route_.pieces.push_back(std::move(piece));
@@ -85,6 +91,9 @@ private:
 
     bool isNowhere(const LandXmlElement &element) const
     {
+        if (!element.start.isGiven() || !element.end.isGiven()) {
+            return false;
+        }
         const auto start = geometry_.positionOf(element.start);
         const auto end = geometry_.positionOf(element.end);
         const auto *from = std::get_if<PlanePoint>(&start);

@@ -15,16 +15,18 @@ struct LandXmlRoute
     /// An element of the alignment along it.
     struct Piece
     {
-        std::size_t element; ///< index among the stored ones
-        double start;        ///< distance from the alignment's start
-        double length;
+        std::size_t element;            ///< index among the stored ones
+        double start;                   ///< distance from the alignment's start
+        double length;                  ///< 0 where nothing says it
         std::vector<PlaneCurve> curves; ///< none where it has no geometry
+        bool isPlaced = true;           ///< `start` is known: the length of each element before it is
     };
 
     const LandXmlAlignment *stored = nullptr;
     std::vector<Piece> pieces; ///< elements of no length are left out
     Alignment alignment;       ///< all curves, up to the first element without
     double length = 0;
+    bool isLengthKnown = true; ///< not where an element has neither a geometry nor a stated length
     Stationing stationing{0};
     std::vector<std::variant<LandXmlProfile, LandXmlFault>> profiles; ///< of the grade lines, in their order
     std::optional<LandXmlFault> fault;                                ///< why there is no place along the whole of it

@@ -78,13 +78,22 @@ std::unique_ptr<LandXmlRows> LandXmlRows::make(LandXmlSource source)
 }
 
 LandXmlRows::LandXmlRows(LandXmlSource source)
-    : source_(std::move(source)), modelNotes_(source_.file), passNotes_(source_.file)
+    : source_(std::move(source)),
+      names_(source_.query.name),
+      gradeLines_(source_.query.gradeLine),
+      surfaces_(source_.query.surface),
+      modelNotes_(source_.file),
+      passNotes_(source_.file)
 {
     const QString &version = source_.header.version;
     const QStringList known = {QString(), QStringLiteral("1.0"), QStringLiteral("1.1"), QStringLiteral("1.2"),
                                QStringLiteral("2.0")};
     if (!known.contains(version)) {
         modelNotes_.add(0, Xlate("the file is of version %1: what is read are versions 1.0 to 2.0").arg(version));
+    }
+    if (const QString &unit = source_.header.otherElevationUnit; !unit.isEmpty()) {
+        modelNotes_.add(source_.header.unitsByte,
+                        Xlate("elevationUnit is \"%1\": heights are taken to be in the unit of lengths").arg(unit));
     }
 }
 
@@ -160,9 +169,14 @@ bool LandXmlRows::readAlignments(AlignmentModel &model, LandXmlWants wants)
     return true;
 }
 
-bool LandXmlRows::isNamed(const std::string &name) const
+bool LandXmlRows::expectNames()
 {
-    return source_.query.name.isEmpty() || source_.query.name == QString::fromStdString(name);
+    for (const LandXmlNames *names : {&names_, &gradeLines_, &surfaces_}) {
+        if (!error_) {
+            error_ = names->error(source_.file->path());
+        }
+    }
+    return !error_;
 }
 
 std::vector<InputError> LandXmlRows::notes() const

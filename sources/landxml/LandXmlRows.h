@@ -1,5 +1,6 @@
 #pragma once
 
+#include "LandXmlNames.h"
 #include "LandXmlNotes.h"
 #include "LandXmlQuery.h"
 #include "LandXmlReader.h"
@@ -58,9 +59,10 @@ struct LandXmlSource
 {
     std::shared_ptr<const FileBytes> file;
     LandXmlHeader header;
-    LandXmlQuery query;
+    LandXmlQuery query; ///< its lengths are in metres
     /// Is told how many bytes have been read while more than a batch of rows is read at once. @return false to stop
     ReadProgress progress;
+    double unit = 1; ///< metres in the unit of lengths that the query was asked in, for messages
 };
 
 /// Whether coordinates of elements refer to points.
@@ -116,9 +118,14 @@ protected:
     /// Reads the alignments, and makes their geometry. @return whether that went well
     bool readAlignments(AlignmentModel &model, LandXmlWants wants);
     /// Whether the query asks for something of a name, or for all.
-    bool isNamed(const std::string &name) const;
+    bool isNamed(const std::string &name) { return names_.matches(name); }
+    /// Fails where names that the query asks for are not among those that were looked at. @return whether they are
+    bool expectNames();
 
     LandXmlSource source_;
+    LandXmlNames names_;      ///< of groups, surfaces, parcels or alignments
+    LandXmlNames gradeLines_; ///< of grade lines
+    LandXmlNames surfaces_;   ///< of surfaces along and across alignments
     LandXmlNotes modelNotes_; ///< of what is read once
     LandXmlNotes passNotes_;  ///< of the pass at hand, where rows are made while the file is read
     std::size_t position_ = 0;

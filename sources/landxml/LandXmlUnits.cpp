@@ -4,7 +4,9 @@
 #include "ValueParser.h"
 #include "Xlate.h"
 
+#include <algorithm>
 #include <cmath>
+#include <iterator>
 #include <numbers>
 #include <string>
 
@@ -134,6 +136,21 @@ private:
         failUnit(attribute, attributes.text(attribute));
     }
 
+    /// Coordinates have one unit; another one of heights is stated by programs that do not convert them. The feet differ by
+    /// less than heights have digits.
+    void takeElevationUnit(const XmlAttributes &attributes)
+    {
+        header_.unitsByte = stream_.currentByte();
+        const std::string name = folded(attributes.text("elevationUnit"));
+        constexpr double asFeet = 1e-5;
+        const auto isTheSame = [&](const Unit &unit) {
+            return unit.name == name && std::fabs(unit.size / header_.units.metres - 1) < asFeet;
+        };
+        if (!name.empty() && std::none_of(std::begin(lengths), std::end(lengths), isTheSame)) {
+            header_.otherElevationUnit = textOf(attributes.text("elevationUnit"));
+        }
+    }
+
     void takeAngle(const XmlAttributes &attributes, const char *attribute, LandXmlAngle &form)
     {
         const auto value = attributes.find(attribute);
@@ -163,6 +180,7 @@ private:
         if (units.metres == usFoot && (area == "acre" || area == "squarefoot")) {
             units.squareMetres *= (usFoot / 0.3048) * (usFoot / 0.3048);
         }
+        takeElevationUnit(attributes);
         takeAngle(attributes, "angularUnit", units.angle);
         takeAngle(attributes, "directionUnit", units.direction);
         hasUnits_ = true;

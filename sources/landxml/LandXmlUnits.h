@@ -33,6 +33,8 @@ struct LandXmlHeader
 {
     QString version; ///< empty where the file says none
     LandXmlUnits units;
+    std::size_t unitsByte = 0;  ///< where they stand
+    QString otherElevationUnit; ///< that the file states; empty where it is that of its lengths
 };
 
 /// Reads a file up to its units. A file without them, or with a unit that is not known, is wrong: nobody could say what its

@@ -37,21 +37,15 @@ bool BorderRows::readParcels()
         return false;
     }
     const LandXmlGeometry geometry(source_.header.units, source_.query.tolerance, points, &modelNotes_);
-    std::size_t budget = 1000000;
     for (const LandXmlParcel &parcel : parcels_) {
-        if (!isNamed(parcel.name)) {
-            continue;
-        }
-        borders_.push_back(borderOf(parcel, geometry));
-        for (const auto &[element, curve] : borders_.back().courses) {
-            if (curve.pieces() > budget) {
-                fail(parcel.byte, Xlate("the elements wind round too often"));
+        if (isNamed(parcel.name)) {
+            borders_.push_back(borderOf(parcel, geometry));
+            if (error_) {
                 return false;
             }
-            budget -= curve.isLine() || curve.pieces() == 1 ? 0 : curve.pieces();
         }
     }
-    return true;
+    return expectNames();
 }
 
 ParcelBorder BorderRows::borderOf(const LandXmlParcel &parcel, const LandXmlGeometry &geometry)
@@ -68,6 +62,13 @@ ParcelBorder BorderRows::borderOf(const LandXmlParcel &parcel, const LandXmlGeom
         }
         for (const PlaneCurve &curve : std::get<std::vector<PlaneCurve>>(made)) {
             border.courses.emplace_back(i, curve);
+            // A small file can hold curves whose area would take minutes. Those of real borders do not wind at all.
+            const std::size_t pieces = curve.isLine() || curve.pieces() == 1 ? 0 : curve.pieces();
+            if (pieces > budget_) {
+                fail(parcel.byte, Xlate("the elements wind round too often"));
+                return border;
+            }
+            budget_ -= pieces;
         }
     }
     measure(border, isWhole && !border.courses.empty());

@@ -31,6 +31,7 @@ private:
     void measure(ParcelBorder &border, bool isWhole);
 
     std::vector<LandXmlParcel> parcels_;
+    std::size_t budget_ = 100000; ///< pieces of curves that may still be measured
 };
 
 class ParcelRows : public BorderRows

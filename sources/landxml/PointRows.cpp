@@ -71,8 +71,9 @@ bool PointRows::readMore()
         isMore_ = reader_->readSome();
         position_ = reader_->position();
         while (owners_.size() < reader_->owners().size()) {
-            owners_.push_back(reader_->owners()[owners_.size()]);
-            isOwnerWanted_.push_back(isNamed(owners_.back()));
+            const std::size_t owner = owners_.size();
+            owners_.push_back(reader_->owners()[owner]);
+            isOwnerWanted_.push_back(reader_->isSurface(owner) == isOfSurfaces() && isNamed(owners_.back()));
         }
     }
     return reader_->pointCount() > 0;
@@ -83,6 +84,9 @@ bool PointRows::next()
     while (true) {
         if (index_ == reader_->pointCount() && !readMore()) {
             error_ = reader_->error();
+            if (!error_ && !isMore_) {
+                expectNames();
+            }
             return false;
         }
         point_ = &reader_->point(index_++);
@@ -194,9 +198,9 @@ bool ProjectedRows::load()
     if (!readAlignments(model_, {})) {
         return false;
     }
+    LandXmlNames alignments(source_.query.alignment);
     for (const LandXmlRoute &route : model_.routes) {
-        if (source_.query.alignment.isEmpty() || QString::fromStdString(route.stored->name) == source_.query.alignment)
-        {
+        if (alignments.matches(route.stored->name)) {
             if (route_ != nullptr && source_.query.alignment.isEmpty()) {
                 fail(route.stored->byte, Xlate("the file has several alignments: the name of one was expected"));
                 return false;
@@ -204,9 +208,12 @@ bool ProjectedRows::load()
             route_ = route_ == nullptr ? &route : route_;
         }
     }
+    error_ = alignments.error(source_.file->path());
+    if (error_) {
+        return false;
+    }
     if (route_ == nullptr) {
-        error_ = InputError{source_.file->path(), std::nullopt,
-                            Xlate("the alignment \"%1\" is not in the file").arg(source_.query.alignment)};
+        error_ = InputError{source_.file->path(), std::nullopt, Xlate("the file has no alignment")};
         return false;
     }
     if (route_->fault) {
@@ -215,6 +222,13 @@ bool ProjectedRows::load()
     }
     if (route_->alignment.elements().empty()) {
         fail(route_->stored->byte, Xlate("the alignment has no elements"));
+        return false;
+    }
+    for (const LandXmlGradeLine &line : route_->stored->gradeLines) {
+        gradeLines_.matches(line.name);
+    }
+    error_ = gradeLines_.error(source_.file->path());
+    if (error_) {
         return false;
     }
     profile_ = route_->profile(source_.query.gradeLine.toStdString());

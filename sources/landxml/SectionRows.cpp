@@ -58,14 +58,13 @@ bool SectionRows::load()
     if (!readAlignments(model_, wants)) {
         return false;
     }
-    const std::string surface = source_.query.surface.toStdString();
     for (const LandXmlRoute &route : model_.routes) {
         if (!isNamed(route.stored->name)) {
             continue;
         }
         for (const LandXmlSection &section : route.stored->sections) {
             for (const LandXmlSectionSurface &layer : section.surfaces) {
-                const std::size_t points = surface.empty() || layer.name == surface ? layer.points.size() : 0;
+                const std::size_t points = surfaces_.matches(layer.name) ? layer.points.size() : 0;
                 for (std::size_t i = 0; i < points; ++i) {
                     rows_.push_back({&route, &section, &layer, i});
                 }
@@ -73,7 +72,7 @@ bool SectionRows::load()
         }
     }
     count_ = rows_.size();
-    return true;
+    return expectNames();
 }
 
 void SectionRows::take(std::size_t index)
@@ -85,7 +84,8 @@ void SectionRows::take(std::size_t index)
     surface_ = row.surface;
     index_ = row.point;
     if (isNew) {
-        place_ = route_->fault ? std::nullopt : route_->alignment.at(section_->station - route_->stationing.start());
+        const bool isPlaced = !route_->fault && !section_->isSkew;
+        place_ = isPlaced ? route_->alignment.at(section_->station - route_->stationing.start()) : std::nullopt;
     }
 }
 

@@ -107,12 +107,25 @@ bool StationRows::load()
     for (std::size_t i = 0; i < model_.routes.size(); ++i) {
         const LandXmlRoute &route = model_.routes[i];
         lines_.push_back({route.profile(gradeLine), route.surface(surface)});
-        if (isNamed(route.stored->name) && !addRoute(i)) {
-            return false;
+        if (isNamed(route.stored->name)) {
+            lookAtNames(*route.stored);
+            if (!addRoute(i)) {
+                return false;
+            }
         }
     }
     count_ = rows_.size();
-    return true;
+    return expectNames();
+}
+
+void StationRows::lookAtNames(const LandXmlAlignment &alignment)
+{
+    for (const LandXmlGradeLine &line : alignment.gradeLines) {
+        gradeLines_.matches(line.name);
+    }
+    for (const LandXmlHeightLine &line : alignment.surfaceLines) {
+        surfaces_.matches(line.name);
+    }
 }
 
 /// Adds the rows of an alignment.
@@ -207,11 +220,12 @@ void StationRows::addStations(const LandXmlRoute &route, std::vector<double> &di
     for (const double station : source_.query.stations) {
         const std::vector<double> places = route.stationing.placesOf(station, end);
         if (places.size() != 1) {
-            modelNotes_.add(route.stored->byte,
-                            places.empty() ? Xlate("the alignment has no station %1")
-                                                 .arg(QString::number(station / source_.header.units.metres, 'f', 3))
-                                           : Xlate("the alignment has the station %1 at several places")
-                                                 .arg(QString::number(station / source_.header.units.metres, 'f', 3)));
+            modelNotes_.add(
+                route.stored->byte,
+                places.empty()
+                    ? Xlate("the alignment has no station %1").arg(QString::number(station / source_.unit, 'f', 3))
+                    : Xlate("the alignment has the station %1 at several places")
+                          .arg(QString::number(station / source_.unit, 'f', 3)));
         }
         for (const double place : places) {
             distances.push_back(place - route.stationing.start());

@@ -35,6 +35,7 @@ private:
         const LandXmlHeightLine *surface;
     };
 
+    void lookAtNames(const LandXmlAlignment &alignment);
     bool addRoute(std::size_t index);
     bool addInterval(const LandXmlRoute &route, std::vector<double> &distances);
     bool addRound(const LandXmlRoute &route, std::vector<double> &distances) const;
@@ -54,7 +55,6 @@ private:
     std::optional<double> ground_;
     std::optional<double> grade_;
     const StationEquation *equation_ = nullptr;
-    mutable std::string text_;
 };
 
 } // namespace kareport

@@ -113,7 +113,7 @@ TEST(LandXmlElements, AFullCircleIsToldFromNothingByItsLength)
         const char *reason;
     };
     constexpr Row rows[] = {
-        {"length='628.3185'", "1100 500", "628.319", "a circle"},
+        {"length='628.319'", "1100 500", "628.319", "a circle"},
         {"delta='360'", "1100 500", "628.319", "by its angle"},
         {"length='0.0001'", "1099.9999 500", "0.000", "an end that its digits put before the start"},
         {"length='628.3184'", "1099.9999 500", "628.318", "nearly a circle"},
@@ -259,6 +259,39 @@ TEST(LandXmlElements, WithoutGeometryAreListedAndSaid)
         EXPECT_TRUE(textOfError(places.list->error()).contains(QString::fromLatin1(row.contains))) << row.reason;
         EXPECT_TRUE(placeText(places.list->error()).startsWith(u"5:")) << row.reason;
     }
+}
+
+TEST(LandXmlElements, OfOtherKindsKeepTheirPlaceAndHaveNoGeometry)
+{
+    const QByteArray line = "<Line><Start>0 0</Start><End>10 0</End></Line>";
+    const QByteArray content =
+        fileOf(alignment(line + "\n<Chain>a b c</Chain>\n<Line><Start>30 0</Start><End>40 0</End></Line>"));
+    LandXmlFile file(content, queryOf(Kind::Elements),
+                     {QStringLiteral("Element"), QStringLiteral("Type"), QStringLiteral("Form"),
+                      QStringLiteral("StartStation"), QStringLiteral("EndStation"), QStringLiteral("Length"),
+                      QStringLiteral("StartRadius")});
+    EXPECT_EQ(file.rows(0),
+              QStringList({u"1|Line|-|0|10|10|inf"_qs, u"2|Chain|-|10|-|-|-"_qs, u"3|Line|-|-|-|10|inf"_qs}))
+        << "nobody knows where the third one begins";
+    EXPECT_EQ(file.notes(), QStringList(u"6:1: not supported: an element \"Chain\" of an alignment or a border"_qs));
+
+    LandXmlFile lengths(content, queryOf(Kind::Alignments), {QStringLiteral("Length"), QStringLiteral("EndStation")});
+    EXPECT_EQ(lengths.rows(), QStringList(u"-|-"_qs));
+    LandXmlFile places(content, queryOf(Kind::Stations));
+    EXPECT_EQ(places.rows(), QStringList());
+    EXPECT_EQ(placeText(places.list->error()), u"6:1"_qs);
+    LandXmlFile feature(fileOf(alignment(line + "<Feature/>")), queryOf(Kind::Elements), {QStringLiteral("Type")});
+    EXPECT_EQ(feature.rows(), QStringList(u"Line"_qs)) << "what says more of an element is none";
+    EXPECT_EQ(feature.notes(), QStringList(u"Feature: 1 in the file, which no list reads"_qs));
+}
+
+TEST(LandXmlElements, WithoutGeometryButWithALengthLeaveTheStationsAfterThem)
+{
+    LandXmlFile file(fileOf(alignment("<Curve length='10'><Start>0 0</Start><End>10 0</End></Curve>"
+                                      "<Line><Start>10 0</Start><End>15 0</End></Line>")),
+                     queryOf(Kind::Elements),
+                     {QStringLiteral("StartStation"), QStringLiteral("EndStation"), QStringLiteral("Length")});
+    EXPECT_EQ(file.rows(0), QStringList({u"0|10|10"_qs, u"10|15|5"_qs}));
 }
 
 TEST(LandXmlElements, TheirPointsMayBeReferred)

@@ -82,6 +82,9 @@ TEST(LandXmlParcels, WhatDoesNotFitIsNoted)
         {"<Parcel><CoordGeom>" + line(0, 0, 10, 0) + line(10, 0, 10, 10) +
              "<Line><Start>10 10</Start></Line></CoordGeom></Parcel>",
          "End was expected", "-"},
+        {"<Parcel><CoordGeom>" + line(0, 0, 10, 0) + line(10, 0, 10, 10) + "<Chain>a b</Chain>" + line(10, 10, 0, 0) +
+             "</CoordGeom></Parcel>",
+         "not supported: an element \"Chain\"", "-"},
     };
     for (const Row &row : rows) {
         LandXmlFile file(fileOf("<Parcels>" + row.parcel + "</Parcels>"), queryOf(Kind::Parcels),

@@ -44,7 +44,48 @@ TEST(LandXmlPoints, OfAGroupAreListedAlone)
     const QByteArray content = fileOf("<CgPoints name='a'><CgPoint name='1'>1 1</CgPoint></CgPoints>"
                                       "<CgPoints name='b'><CgPoint name='2'>2 2</CgPoint></CgPoints>");
     EXPECT_EQ(LandXmlFile(content, queryOf(Kind::Points, "b"), {QStringLiteral("Name")}).rows(), QStringList(u"2"_qs));
-    EXPECT_EQ(LandXmlFile(content, queryOf(Kind::Points, "c"), {QStringLiteral("Name")}).rows(), QStringList());
+    for (const char *wrong : {"c", "A"}) {
+        LandXmlFile file(content, queryOf(Kind::Points, wrong), {QStringLiteral("Name")});
+        EXPECT_EQ(file.rows(), QStringList()) << wrong;
+        EXPECT_EQ(textOfError(file.list->error()),
+                  QStringLiteral("\"%1\" is not in the file: one of a, b was expected").arg(QLatin1StringView(wrong)));
+    }
+    LandXmlFile none(fileOf("<CgPoints><CgPoint name='1'>1 1</CgPoint></CgPoints>"), queryOf(Kind::Points, "c"));
+    EXPECT_EQ(none.rows(), QStringList());
+    EXPECT_EQ(textOfError(none.list->error()), u"\"c\" is not in the file, which has no names for it"_qs);
+}
+
+TEST(LandXmlPoints, AnErrorNamesAFewOfManyGroups)
+{
+    QByteArray groups;
+    for (int i = 1; i <= 12; ++i) {
+        groups += "<CgPoints name='g" + QByteArray::number(i) + "'/>";
+    }
+    LandXmlFile file(fileOf(groups), queryOf(Kind::Points, "g"));
+    EXPECT_EQ(file.rows(), QStringList());
+    EXPECT_EQ(textOfError(file.list->error()),
+              u"\"g\" is not in the file: one of g1, g2, g3, g4, g5, g6, g7, g8, g9, g10, … was expected"_qs);
+}
+
+TEST(LandXmlPoints, AfterAGroupInAGroupBelongToTheOuterOne)
+{
+    LandXmlFile file(fileOf("<CgPoints name='a'><CgPoint name='1'>1 1</CgPoint><CgPoints name='b'><CgPoint name='2'>2 2"
+                            "</CgPoint></CgPoints><CgPoint name='3'>3 3</CgPoint></CgPoints>"),
+                     queryOf(Kind::Points), {QStringLiteral("Name"), QStringLiteral("Group")});
+    EXPECT_EQ(file.rows(), QStringList({u"1|a"_qs, u"2|b"_qs, u"3|a"_qs}));
+}
+
+TEST(LandXmlPoints, TheNameOfASurfaceIsNoGroup)
+{
+    const QByteArray content =
+        fileOf("<CgPoints name='a'><CgPoint name='1'>1 1</CgPoint></CgPoints><Surfaces><Surface name='s'><Definition>"
+               "<Pnts><P id='1'>1 2 3</P></Pnts></Definition></Surface></Surfaces>");
+    LandXmlFile points(content, queryOf(Kind::Points, "s"), {QStringLiteral("Name")});
+    EXPECT_EQ(points.rows(), QStringList());
+    EXPECT_TRUE(textOfError(points.list->error()).contains(u"one of a was expected"));
+    LandXmlFile surface(content, queryOf(Kind::SurfacePoints, "a"), {QStringLiteral("Name")});
+    EXPECT_EQ(surface.rows(), QStringList());
+    EXPECT_TRUE(textOfError(surface.list->error()).contains(u"one of s was expected"));
 }
 
 TEST(LandXmlPoints, OfSurfacesHaveTheirSurface)

@@ -1,3 +1,4 @@
+#include "InputErrorText.h"
 #include "LandXmlFile.h"
 #include "LandXmlRoad.h"
 
@@ -89,6 +90,22 @@ TEST(LandXmlProfile, APointThatStandsTwiceIsOneAndACurveOfNoLengthIsNone)
                       QStringLiteral("CurveLength")});
     EXPECT_EQ(file.rows(0), QStringList({u"0|-|10|-"_qs, u"10|10|-10|-"_qs, u"10|10|-10|-"_qs, u"20|-10|-|-"_qs}));
     EXPECT_EQ(file.notes(), QStringList());
+}
+
+TEST(LandXmlProfile, OfOneGradeLineIsListedAlone)
+{
+    const QByteArray content = fileOf(alignment(
+        bend(), "name='road'", {},
+        "<Profile><ProfAlign name='left'><PVI>0 1</PVI><PVI>150 2</PVI></ProfAlign><ProfAlign name='right'><PVI>0 3"
+        "</PVI><PVI>150 4</PVI></ProfAlign></Profile>"));
+    LandXmlQuery query = queryOf(Kind::Profile);
+    query.gradeLine = u"right"_qs;
+    LandXmlFile file(content, query, {QStringLiteral("GradeLine"), QStringLiteral("Elevation")});
+    EXPECT_EQ(file.rows(0), QStringList({u"right|3"_qs, u"right|4"_qs}));
+    query.gradeLine = u"middle"_qs;
+    LandXmlFile missing(content, query);
+    EXPECT_EQ(missing.rows(), QStringList());
+    EXPECT_EQ(textOfError(missing.list->error()), u"\"middle\" is not in the file: one of left, right was expected"_qs);
 }
 
 TEST(LandXmlProfile, StationsAreNamedByTheEquations)

@@ -68,6 +68,28 @@ TEST(LandXmlSections, BesideAnAlignmentWithoutGeometryHaveNoCoordinates)
     EXPECT_EQ(file.rows(0), QStringList(u"5|1|-"_qs));
 }
 
+TEST(LandXmlSections, AtASkewHaveNoCoordinates)
+{
+    const QByteArray surface = "<CrossSectSurf><PntList2D>1 2</PntList2D></CrossSectSurf></CrossSect>";
+    LandXmlFile file(withSections("<CrossSect sta='5' angleSkew='0'>" + surface +
+                                  "\n<CrossSect sta='6' angleSkew='10'>" + surface + "<CrossSect sta='7'>" + surface),
+                     queryOf(Kind::CrossSections), {QStringLiteral("Offset"), QStringLiteral("Northing")});
+    EXPECT_EQ(file.rows(0), QStringList({u"1|1005"_qs, u"1|-"_qs, u"1|1007"_qs}));
+    ASSERT_EQ(file.notes().size(), 1);
+    EXPECT_TRUE(file.notes().front().startsWith(u"9:1: not supported: coordinates of a cross section"));
+}
+
+TEST(LandXmlSections, OfASurfaceThatIsNotThereAreAnError)
+{
+    LandXmlQuery query = queryOf(Kind::CrossSections);
+    query.surface = u"rock"_qs;
+    LandXmlFile file(withSections("<CrossSect sta='5'><CrossSectSurf name='ground'><PntList2D>1 2</PntList2D>"
+                                  "</CrossSectSurf></CrossSect>"),
+                     query);
+    EXPECT_EQ(file.rows(), QStringList());
+    EXPECT_EQ(textOfError(file.list->error()), u"\"rock\" is not in the file: one of ground was expected"_qs);
+}
+
 TEST(LandXmlSections, WithoutAStationAreErrors)
 {
     LandXmlFile file(withSections("\n<CrossSect name='S1'/>"), queryOf(Kind::CrossSections));

@@ -115,8 +115,35 @@ TEST(LandXmlStations, HaveHeightsOfTheGradeLineAndTheSurface)
               QStringList({u"10.00|2.00|11.00|-1.00"_qs, u"10.50|2.00|10.00|0.50"_qs, u"11.00|2.00|9.00|2.00"_qs,
                            u"11.50|2.00|10.00|1.50"_qs, u"12.00|2.00|11.00|1.00"_qs}));
     query.gradeLine = u"other"_qs;
+    EXPECT_EQ(LandXmlFile(content, query, variables).row(1, 2), u"0.00|0.00|10.00|-10.00"_qs);
     query.surface = u"rock"_qs;
-    EXPECT_EQ(LandXmlFile(content, query, variables).row(1, 2), u"0.00|0.00|-|-"_qs) << "a surface that is not there";
+    LandXmlFile rock(content, query, variables);
+    EXPECT_EQ(rock.rows(), QStringList());
+    EXPECT_EQ(textOfError(rock.list->error()), u"\"rock\" is not in the file: one of ground was expected"_qs);
+    query.surface.clear();
+    query.gradeLine = u"old"_qs;
+    LandXmlFile old(content, query, variables);
+    EXPECT_EQ(old.rows(), QStringList());
+    EXPECT_EQ(textOfError(old.list->error()), u"\"old\" is not in the file: one of design, other was expected"_qs);
+    LandXmlFile lane(content, queryOf(Kind::Stations, "lane"), variables);
+    EXPECT_EQ(lane.rows(), QStringList());
+    EXPECT_EQ(textOfError(lane.list->error()), u"\"lane\" is not in the file: one of road was expected"_qs);
+}
+
+TEST(LandXmlStations, MayBeAskedForInTheUnitOfTheFile)
+{
+    const QByteArray feet = "<LandXML><Units><Imperial linearUnit='USSurveyFoot'/></Units>" +
+                            alignment("<Line><Start>0 0</Start><End>3937 0</End></Line>") + "</LandXML>";
+    LandXmlQuery query = queryOf(Kind::Stations);
+    query.unit.reset();
+    query.interval = 1968.5;
+    query.stations = {39.37, 4000};
+    query.offsets = {{-78.74, std::nullopt}};
+    LandXmlFile file(feet, query, {QStringLiteral("Station"), QStringLiteral("Easting1")});
+    EXPECT_EQ(file.rows(6), QStringList({u"0.000000|-24.000000"_qs, u"12.000000|-24.000000"_qs,
+                                         u"600.000000|-24.000000"_qs, u"1200.000000|-24.000000"_qs}))
+        << "3937 feet are 1200 metres";
+    EXPECT_TRUE(file.notes().value(0).contains(u"the alignment has no station 4000.000")) << "as it was asked for";
 }
 
 TEST(LandXmlStations, HavePointsBesideThem)

@@ -1,6 +1,7 @@
 #include "LandXmlUnits.h"
 #include "InputErrorText.h"
 #include "JobFolder.h"
+#include "LandXmlFile.h"
 
 #include <gtest/gtest.h>
 
@@ -53,6 +54,33 @@ TEST(LandXmlUnits, LengthsAndAreas)
         EXPECT_DOUBLE_EQ(units.metres, row.metres) << row.units;
         EXPECT_DOUBLE_EQ(units.squareMetres, row.squareMetres) << row.units;
     }
+}
+
+TEST(LandXmlUnits, AnotherUnitOfHeightsIsTold)
+{
+    struct Row
+    {
+        const char *units;
+        const char *other;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {"<Metric linearUnit='meter'/>", "", "none is stated"},
+        {"<Metric linearUnit='meter' elevationUnit='meter'/>", "", "the same"},
+        {"<Imperial linearUnit='USSurveyFoot' elevationUnit='feet'/>", "", "the feet differ by less than the digits"},
+        {"<Imperial linearUnit='foot' elevationUnit='meter'/>", "meter", "heights in metres"},
+        {"<Metric linearUnit='meter' elevationUnit='fathom'/>", "fathom", "nobody knows"},
+    };
+    for (const Row &row : rows) {
+        const auto header = headerOf(withUnits(row.units));
+        ASSERT_EQ(errorOf(header), nullptr) << row.reason;
+        EXPECT_EQ(std::get<LandXmlHeader>(header).otherElevationUnit, QString::fromLatin1(row.other)) << row.reason;
+    }
+    landxml::LandXmlFile file(withUnits("\n<Imperial linearUnit='foot' elevationUnit='meter'/>"),
+                              landxml::queryOf(LandXmlListKind::Elements));
+    file.rows();
+    EXPECT_EQ(file.notes(),
+              QStringList(u"2:1: elevationUnit is \"meter\": heights are taken to be in the unit of lengths"_qs));
 }
 
 TEST(LandXmlUnits, AnglesAndDirections)
