@@ -1,12 +1,15 @@
 include(CMakePackageConfigHelpers)
 
 # Three components: library, development, programs.
-install(TARGETS KaReportHost KaReport EXPORT KaReportTargets
+install(TARGETS KaReportHost KaReport ka_package_headers ka_package EXPORT KaReportTargets
         LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR} COMPONENT library NAMELINK_COMPONENT development)
+# They name each other as the files beside them, so one include path serves: <KaReport/UReportDoc.h>.
+set(installed_headers)
 foreach(library KaReportHost KaReport)
     get_property(headers TARGET ${library} PROPERTY KA_INSTALLED_HEADERS)
-    install(FILES ${headers} DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}/KaReport COMPONENT development)
+    list(APPEND installed_headers ${headers})
 endforeach()
+install(FILES ${installed_headers} DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}/KaReport COMPONENT development)
 install(TARGETS kareport kareport-desk RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR} COMPONENT programs)
 install(FILES LICENSES.md CHANGELOG.md DESTINATION ${CMAKE_INSTALL_DOCDIR} COMPONENT programs)
 install(FILES examples/survey.xml DESTINATION ${CMAKE_INSTALL_DATADIR}/kareport/templates COMPONENT library)
@@ -23,3 +26,9 @@ write_basic_package_version_file(${CMAKE_CURRENT_BINARY_DIR}/KaReportConfigVersi
                                  COMPATIBILITY SameMinorVersion)
 install(FILES ${CMAKE_CURRENT_BINARY_DIR}/KaReportConfig.cmake ${CMAKE_CURRENT_BINARY_DIR}/KaReportConfigVersion.cmake
         DESTINATION ${config_dir} COMPONENT development)
+
+# The folder is told from where the file is found, as the installation may be moved, or made elsewhere than it was configured.
+file(RELATIVE_PATH pc_prefix /${CMAKE_INSTALL_LIBDIR}/pkgconfig /)
+string(REGEX REPLACE "/$" "" pc_prefix "${pc_prefix}")
+configure_file(cmake/kareport.pc.in ${CMAKE_CURRENT_BINARY_DIR}/kareport.pc @ONLY)
+install(FILES ${CMAKE_CURRENT_BINARY_DIR}/kareport.pc DESTINATION ${CMAKE_INSTALL_LIBDIR}/pkgconfig COMPONENT development)

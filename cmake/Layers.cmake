@@ -46,33 +46,37 @@ function(ka_precompile target widgets)
 endfunction()
 
 # ka_layer(<target> LINKS <targets...> USES <libraries...> HEADERS <public...> PRIVATE_HEADERS <own...> SOURCES <...>
-#          [WIDGETS])
+#          [COMMON_SOURCES <...>] [WIDGETS])
 #
 # A folder of the module or of the host. LINKS are the layers below and what the headers need of other libraries; USES is
-# what the sources alone need. HEADERS are installed; PRIVATE_HEADERS serve the layers above inside this project only.
-# WIDGETS says that the sources see Qt's windows.
+# what the sources alone need. HEADERS are what a host program includes, and are installed; only what they mark with
+# KAREPORT_EXPORT is offered by the shared libraries. PRIVATE_HEADERS serve the layers above inside this project.
+# COMMON_SOURCES, of a host's folder, are what the module needs as well without asking its host for it: each shared library
+# has them for itself, so they keep nothing that both would have to know. WIDGETS says that the sources see Qt's windows.
 #
-# Three targets are made, as the same code is linked in two ways:
+# Targets are made for the two ways in which the same code is linked:
 #   <target>_api      the headers of this layer and of those below it; nothing is linked by it
-#   <target>_objects  the compiled sources, which the shared library is made of
-#   <target>          the layer and those below it as static libraries, for what must see more than the shared libraries
-#                     offer: tests and benchmarks
+#   <target>_objects  the compiled sources, which a shared library is made of; <target>_common_objects the common ones
+#   <target>          the layer and those below it as static libraries, for all else in this project: programs, tests and
+#                     benchmarks use more than the shared libraries offer
 function(ka_layer target)
-    cmake_parse_arguments(arg "WIDGETS" "" "LINKS;USES;HEADERS;PRIVATE_HEADERS;SOURCES" ${ARGN})
-    ka_apis(apis ${arg_LINKS})
-    add_library(${target}_api INTERFACE)
-    target_include_directories(${target}_api INTERFACE ${CMAKE_CURRENT_SOURCE_DIR})
-    target_link_libraries(${target}_api INTERFACE ${apis})
-
-    add_library(${target}_objects OBJECT ${arg_SOURCES})
+    cmake_parse_arguments(arg "WIDGETS" "" "LINKS;USES;HEADERS;PRIVATE_HEADERS;SOURCES;COMMON_SOURCES" ${ARGN})
+    ka_api(${target} ${arg_LINKS})
     # Not of the target: the compiled headers serve what is outside the libraries as well.
-    set_source_files_properties(${arg_SOURCES} PROPERTIES COMPILE_DEFINITIONS KAREPORT_BUILDING)
-    target_link_libraries(${target}_objects PUBLIC ${target}_api ${arg_USES} PRIVATE ka_options ka_hardening)
-
-    ka_precompile(${target}_objects "${arg_WIDGETS}")
+    set_source_files_properties(${arg_SOURCES} ${arg_COMMON_SOURCES} PROPERTIES COMPILE_DEFINITIONS KAREPORT_BUILDING)
+    set(objects ${target}_objects)
+    add_library(${target}_objects OBJECT ${arg_SOURCES})
+    if(arg_COMMON_SOURCES)
+        add_library(${target}_common_objects OBJECT ${arg_COMMON_SOURCES})
+        list(APPEND objects ${target}_common_objects)
+    endif()
+    foreach(library IN LISTS objects)
+        target_link_libraries(${library} PUBLIC ${target}_api ${arg_USES} PRIVATE ka_options ka_hardening)
+        ka_precompile(${library} "${arg_WIDGETS}")
+    endforeach()
 
     add_library(${target} STATIC)
-    target_link_libraries(${target} PUBLIC ${target}_objects ${target}_api ${arg_LINKS} ${arg_USES})
+    target_link_libraries(${target} PUBLIC ${objects} ${target}_api ${arg_LINKS} ${arg_USES})
     target_sources(${target} PUBLIC FILE_SET HEADERS BASE_DIRS ${CMAKE_CURRENT_SOURCE_DIR}
                    FILES ${arg_HEADERS} ${arg_PRIVATE_HEADERS})
     list(TRANSFORM arg_HEADERS PREPEND ${CMAKE_CURRENT_SOURCE_DIR}/)
@@ -81,41 +85,24 @@ endfunction()
 
 # ka_outer_layer(<target> LINKS <targets...> HEADERS <...> SOURCES <...> [WIDGETS])
 #
-# A folder around the module, which the programs share: a static library, and its headers alone as <target>_api. It sees
-# the headers of the layers that it names, and is linked with the module as the program at the end wants it (ka_module).
+# A folder around the module, which the programs share: a static library, and its headers alone as <target>_api.
 function(ka_outer_layer target)
     cmake_parse_arguments(arg "WIDGETS" "" "LINKS;HEADERS;SOURCES" ${ARGN})
-    ka_apis(apis ${arg_LINKS})
-    add_library(${target}_api INTERFACE)
-    target_include_directories(${target}_api INTERFACE ${CMAKE_CURRENT_SOURCE_DIR})
-    target_link_libraries(${target}_api INTERFACE ${apis})
-
+    ka_api(${target} ${arg_LINKS})
     add_library(${target} STATIC ${arg_SOURCES})
     target_sources(${target} PUBLIC FILE_SET HEADERS BASE_DIRS ${CMAKE_CURRENT_SOURCE_DIR} FILES ${arg_HEADERS})
-    set(outer)
-    foreach(link IN LISTS arg_LINKS)
-        if(NOT TARGET ${link}_objects) # a layer of the module comes with it
-            list(APPEND outer ${link})
-        endif()
-    endforeach()
-    target_link_libraries(${target} PUBLIC ${target}_api ${outer} $<LINK_ONLY:ka_module> PRIVATE ka_options ka_hardening)
+    target_link_libraries(${target} PUBLIC ${target}_api ${arg_LINKS} PRIVATE ka_options ka_hardening)
     ka_precompile(${target} "${arg_WIDGETS}")
 endfunction()
 
-# The layers of the module among some targets, as their headers alone.
-function(ka_apis result)
-    set(apis)
-    foreach(target IN LISTS ARGN)
-        if(TARGET ${target}_api)
-            list(APPEND apis ${target}_api)
-        else()
-            list(APPEND apis ${target})
+# The headers of a layer, with those of the layers that it links, as <target>_api.
+function(ka_api target)
+    add_library(${target}_api INTERFACE)
+    target_include_directories(${target}_api INTERFACE ${CMAKE_CURRENT_SOURCE_DIR})
+    foreach(link IN LISTS ARGN)
+        if(TARGET ${link}_api)
+            set(link ${link}_api)
         endif()
+        target_link_libraries(${target}_api INTERFACE ${link})
     endforeach()
-    set(${result} ${apis} PARENT_SCOPE)
 endfunction()
-
-# What needs the module needs it in one of two ways. A program links the shared libraries; a target with the property
-# KA_LINKS_LAYERS, as tests have, links the layers themselves. Both in one program would be two of every variable.
-add_library(ka_module INTERFACE)
-target_link_libraries(ka_module INTERFACE $<IF:$<BOOL:$<TARGET_PROPERTY:KA_LINKS_LAYERS>>,ka_ui,KaReport>)

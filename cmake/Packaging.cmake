@@ -24,11 +24,13 @@ set(CPACK_COMPONENT_LIBRARY_DESCRIPTION "Fixed-pitch reports for civil engineeri
 
 set(CPACK_DEBIAN_DEVELOPMENT_PACKAGE_NAME libkareport-dev)
 set(CPACK_DEBIAN_DEVELOPMENT_PACKAGE_SECTION libdevel)
-set(CPACK_DEBIAN_DEVELOPMENT_PACKAGE_DEPENDS "libkareport0 ${same_version}, qt6-base-dev")
+set(CPACK_DEBIAN_DEVELOPMENT_PACKAGE_DEPENDS "libkareport0 ${same_version}, qt6-base-dev (>= 6.4)")
+set(CPACK_DEBIAN_DEVELOPMENT_PACKAGE_SUGGESTS pkg-config)
 set(CPACK_COMPONENT_DEVELOPMENT_DESCRIPTION "Fixed-pitch reports for civil engineering and surveying: development files
- Headers, and what CMake needs to link against the libraries.")
+ Headers, and what CMake and pkg-config need to link against the libraries.")
 
 set(CPACK_DEBIAN_PROGRAMS_PACKAGE_NAME kareport)
+# For the templates and the font; the programs themselves link the layers.
 set(CPACK_DEBIAN_PROGRAMS_PACKAGE_DEPENDS "libkareport0 ${same_version}")
 set(CPACK_DEBIAN_PROGRAMS_PACKAGE_RECOMMENDS cups)
 set(CPACK_COMPONENT_PROGRAMS_DESCRIPTION "Fixed-pitch reports for civil engineering and surveying: programs

@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QFont>
 #include <QString>
 #include <QStringList>
@@ -15,13 +13,13 @@ inline constexpr qsizetype longestFaceName = 31;
 /// The faces that stand in for a fixed-pitch face that is not installed, the nearest first. The system would take a
 /// proportional one. Where a page is measured, shown, printed and saved as a PDF the same one has to stand in, or lines and
 /// pages would not agree.
-KAREPORT_EXPORT const QStringList &standInFaces();
+const QStringList &standInFaces();
 
 /// A font of a fixed pitch, upright and of normal weight whatever the application's own font is.
 /// @param face  the face that is wanted; `standInFaces` follow it
-KAREPORT_EXPORT QFont fixedPitchFont(const QString &face);
+QFont fixedPitchFont(const QString &face);
 
 /// Has the system take a fixed-pitch face, and `standInFaces` after those that a font names.
-KAREPORT_EXPORT void setFixedPitch(QFont &font);
+void setFixedPitch(QFont &font);
 
 } // namespace kareport

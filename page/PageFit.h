@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QtGlobal>
 
 namespace kareport
@@ -37,6 +35,6 @@ struct PageFit
 /// Fits a page on a sheet: in its own type size, or in the smaller one that has room for all of its rows and for the widest
 /// of them, but not below `smallestType`. What has no room then goes on further sheets. Type that is smaller already stays
 /// as it is.
-KAREPORT_EXPORT PageFit fitPage(const PageText &text, const SheetRoom &room);
+PageFit fitPage(const PageText &text, const SheetRoom &room);
 
 } // namespace kareport

@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QDateTime>
 #include <QLatin1StringView>
 #include <QString>
@@ -16,25 +14,25 @@ namespace kareport
 /// The header line of every page, without the page number: application, title, and the date right-aligned so that the
 /// line with label and number ends a few characters before the row does. Where the row is too short for that, the date stands left and is filled on its
 /// right; this follows from the one width that the line is made with and is kept.
-KAREPORT_EXPORT QString pageHeaderLine(const QString &application, const QString &title, const QDateTime &time,
-                                       const QString &pageLabel, int charsPerRow);
+QString pageHeaderLine(const QString &application, const QString &title, const QDateTime &time,
+                       const QString &pageLabel, int charsPerRow);
 
 /// A date and time such as "Mar 05, 2024  02:07PM", in English on every machine.
-KAREPORT_EXPORT QString pageHeaderDate(const QDateTime &time);
+QString pageHeaderDate(const QDateTime &time);
 
 /// Whether a line, without its line end, is a page header, in whatever language it was written: it ends with the date, the
 /// label of the page number and the number.
-KAREPORT_EXPORT bool isPageHeader(QStringView line);
+bool isPageHeader(QStringView line);
 
 /// Where the lines of a text begin that are page headers.
-KAREPORT_EXPORT std::vector<qint64> pageHeadersIn(QStringView text);
-KAREPORT_EXPORT std::vector<qint64> pageHeadersIn(QLatin1StringView text);
+std::vector<qint64> pageHeadersIn(QStringView text);
+std::vector<qint64> pageHeadersIn(QLatin1StringView text);
 
 /// The lines of a page of a report, as its header lines tell: the number of lines that stands most often from one of them
 /// to the next. Nothing for a text with fewer than two.
-KAREPORT_EXPORT std::optional<int> linesBetweenPageHeaders(QStringView text);
+std::optional<int> linesBetweenPageHeaders(QStringView text);
 /// The same where the header lines are known. @param headers  as `pageHeadersIn` gives them
-KAREPORT_EXPORT std::optional<int> linesBetweenPageHeaders(QStringView text, const std::vector<qint64> &headers);
-KAREPORT_EXPORT std::optional<int> linesBetweenPageHeaders(QLatin1StringView text, const std::vector<qint64> &headers);
+std::optional<int> linesBetweenPageHeaders(QStringView text, const std::vector<qint64> &headers);
+std::optional<int> linesBetweenPageHeaders(QLatin1StringView text, const std::vector<qint64> &headers);
 
 } // namespace kareport

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
 #include "PageDefaults.h"
 #include "PageMeasurement.h"
 
@@ -14,7 +13,7 @@ namespace kareport
 
 /// The page that a report is laid out for: its margins, its font, and how much text has room between the margins, as it was
 /// measured on the default printer or as it was given.
-class KAREPORT_EXPORT PageLayout
+class PageLayout
 {
 public:
     /// Hundredths of a millimetre. What is measured changes by `measure` alone.
@@ -52,6 +51,6 @@ private:
 };
 
 /// The default printer, as the user has reports printed, upright or not.
-KAREPORT_EXPORT std::optional<PageDevice> reportPageDevice();
+std::optional<PageDevice> reportPageDevice();
 
 } // namespace kareport

@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <functional>
 #include <vector>
 
@@ -10,7 +8,7 @@ namespace kareport
 
 /// Which page a line of a report is on, and where a page begins, counted in lines from 0 and pages from 1. It gives what
 /// `reportPages` gives, and follows every edit without looking at the whole text again.
-class KAREPORT_EXPORT PageLines
+class PageLines
 {
 public:
     /// Whether a line of the text has nothing but blanks.

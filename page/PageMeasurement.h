@@ -1,6 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
 #include "PageDefaults.h"
 
 #include <QMargins>
@@ -43,25 +42,25 @@ struct PageGeometry
 };
 
 /// a × b / c, rounded to the nearest whole number, halves away from 0.
-KAREPORT_EXPORT int mulDiv(int a, int b, int c);
+int mulDiv(int a, int b, int c);
 
 /// How many lines and characters fit between the margins (hundredths of a millimetre). The whole sheet counts, not its
 /// printable part.
-KAREPORT_EXPORT PageGeometry measurePage(const PageDevice &device, const QMargins &margins, const FontExtents &font);
+PageGeometry measurePage(const PageDevice &device, const QMargins &margins, const FontExtents &font);
 
 /// A printer, upright or not; nothing when there is none.
-KAREPORT_EXPORT std::optional<PageDevice> pageDevice(const DefaultPrinter &printer, bool portrait);
+std::optional<PageDevice> pageDevice(const DefaultPrinter &printer, bool portrait);
 
 /// The installed printer that the application prints on: the one that the user has selected, or the system's default. Null
 /// when there is none, or when the host has not chosen the system's printers.
-KAREPORT_EXPORT QPrinterInfo applicationPrinter();
+QPrinterInfo applicationPrinter();
 /// Sets an installed printer to the sheet that the user has selected, if one is.
-KAREPORT_EXPORT void setSelectedSheet(QPrinter &printer);
+void setSelectedSheet(QPrinter &printer);
 /// The sheet of the built-in page device.
-KAREPORT_EXPORT QPageSize builtInSheet();
+QPageSize builtInSheet();
 
 /// The extents of a fixed-pitch face at a size in points on a device. A face that is not installed is replaced by the
 /// nearest fixed-pitch face. Needs a running QGuiApplication.
-KAREPORT_EXPORT FontExtents measureFont(const QString &face, unsigned points, int resolution);
+FontExtents measureFont(const QString &face, unsigned points, int resolution);
 
 } // namespace kareport

@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QStringView>
 
 #include <cstddef>
@@ -15,7 +13,7 @@ namespace kareport
 ///
 /// Edits of the text carry them along. A place that no longer stands at the beginning of a line stays, so that it counts
 /// again when the line end comes back; `reportPages` passes it over.
-class KAREPORT_EXPORT PageStarts
+class PageStarts
 {
 public:
     /// In ascending order, each once.

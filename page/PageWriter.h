@@ -1,6 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
 #include "MemoryLasts.h"
 #include "PageDefaults.h"
 #include "PageStarts.h"
@@ -17,7 +16,7 @@ namespace kareport
 {
 
 /// Is told what is written, piece by piece.
-class KAREPORT_EXPORT PageWriterObserver
+class PageWriterObserver
 {
 public:
     virtual ~PageWriterObserver();
@@ -41,7 +40,7 @@ struct PageHeading
 };
 
 /// Lays text out in pages and lines: the counters, the page rule, the header and the heading of every page.
-class KAREPORT_EXPORT PageWriter
+class PageWriter
 {
 public:
     /// The characters after which the text is handed to an outlet: few enough to be near the processor.

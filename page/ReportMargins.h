@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QMargins>
 #include <QString>
 
@@ -9,9 +7,9 @@ namespace kareport
 {
 
 /// Page margins as the profile keeps them: left, top, right, bottom in hundredths of a millimetre, "%d, %d, %d, %d".
-KAREPORT_EXPORT QString marginsToText(const QMargins &margins);
+QString marginsToText(const QMargins &margins);
 /// The margins of such a text. Numbers that are missing leave their margin as it is in `margins`; a piece without a
 /// number counts as 0. No range is checked.
-KAREPORT_EXPORT QMargins marginsFromText(const QString &text, QMargins margins);
+QMargins marginsFromText(const QString &text, QMargins margins);
 
 } // namespace kareport

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "KaReportExport.h"
+#include "ReportPage.h"
 
 #include <QLatin1StringView>
 #include <QStringView>
@@ -10,16 +10,8 @@
 namespace kareport
 {
 
-/// One page of a report.
-struct ReportPage
-{
-    qint64 begin = 0; ///< its first character, from 0
-    qint64 end = 0;   ///< after the line end of its last line; blank lines at its end are left out
-    qint64 lines = 0; ///< from `begin` to `end`; 0 for a blank page
-};
-
 /// Whether a line has nothing that a page shows.
-KAREPORT_EXPORT bool isBlankLine(QStringView line);
+bool isBlankLine(QStringView line);
 
 /// The pages of a text, in order: whatever shows, prints or saves pages asks here.
 ///
@@ -28,16 +20,14 @@ KAREPORT_EXPORT bool isBlankLine(QStringView line);
 /// of the part that is cut by lines; a text of blank lines alone is one page, an empty text none.
 /// @param starts        in ascending order
 /// @param linesPerPage  below 1 counts as 1
-KAREPORT_EXPORT std::vector<ReportPage> reportPages(QStringView text, const std::vector<qint64> &starts,
-                                                    int linesPerPage);
-KAREPORT_EXPORT std::vector<ReportPage> reportPages(QLatin1StringView text, const std::vector<qint64> &starts,
-                                                    int linesPerPage);
+std::vector<ReportPage> reportPages(QStringView text, const std::vector<qint64> &starts, int linesPerPage);
+std::vector<ReportPage> reportPages(QLatin1StringView text, const std::vector<qint64> &starts, int linesPerPage);
 
 /// The lines, from 0, that the recorded starts stand at the beginning of; the other starts are left out.
-KAREPORT_EXPORT std::vector<qint64> linesOfStarts(QStringView text, const std::vector<qint64> &starts);
-KAREPORT_EXPORT std::vector<qint64> linesOfStarts(QLatin1StringView text, const std::vector<qint64> &starts);
+std::vector<qint64> linesOfStarts(QStringView text, const std::vector<qint64> &starts);
+std::vector<qint64> linesOfStarts(QLatin1StringView text, const std::vector<qint64> &starts);
 /// The places at which such lines begin; lines that the text does not have are left out.
-KAREPORT_EXPORT std::vector<qint64> startsOfLines(QStringView text, const std::vector<qint64> &lines);
-KAREPORT_EXPORT std::vector<qint64> startsOfLines(QLatin1StringView text, const std::vector<qint64> &lines);
+std::vector<qint64> startsOfLines(QStringView text, const std::vector<qint64> &lines);
+std::vector<qint64> startsOfLines(QLatin1StringView text, const std::vector<qint64> &lines);
 
 } // namespace kareport

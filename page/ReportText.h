@@ -1,7 +1,6 @@
 #pragma once
 
 #include "CharacterBlocks.h"
-#include "KaReportExport.h"
 #include "PendingEdits.h"
 
 #include <QLatin1StringView>
@@ -16,7 +15,7 @@ namespace kareport
 ///
 /// Most reports hold no character above U+00FF. Such a text is kept with one byte a character, which halves the memory of
 /// long reports, until somebody asks for it in UTF-16 or writes another character.
-class KAREPORT_EXPORT ReportText
+class ReportText
 {
 public:
     /// What memory is got with: `realloc`, or a test's own.

@@ -19,6 +19,7 @@ public:
 
     /// Takes what comes next in the text. @return false once something could not be taken; what comes then is passed over
     virtual bool write(QStringView text) = 0;
+    /// The same for characters up to U+00FF.
     virtual bool write(QLatin1StringView text) = 0;
 };
 

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
 #include "PageFit.h"
 #include "PrintFaces.h"
 
@@ -22,7 +21,7 @@ struct PageArea;
 /// A line that is wider than the page goes on in the next row. A page takes one row at least, however high it is.
 ///
 /// Faces are made once: a pager serves one job, in which the text stays as it is.
-class KAREPORT_EXPORT LinePager
+class LinePager
 {
 public:
     /// Text and device must outlive the pager.

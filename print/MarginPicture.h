@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QRect>
 
 class QPainter;
@@ -11,6 +9,6 @@ namespace kareport
 
 /// Draws the edges of a rectangle in twips, and a numbered line for each row of text between them. Nothing where the
 /// painter does not paint.
-KAREPORT_EXPORT void drawMargins(QPainter &painter, const QRect &twips);
+void drawMargins(QPainter &painter, const QRect &twips);
 
 } // namespace kareport

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
 #include "PageSetupForm.h"
 
 #include <QDialog>
@@ -9,7 +8,7 @@ namespace kareport
 {
 
 /// Asks for the set-up of a page. It is not left with OK while the margins leave no room for text.
-class KAREPORT_EXPORT PageSetupDialog : public QDialog
+class PageSetupDialog : public QDialog
 {
 public:
     explicit PageSetupDialog(const PageSetup &setup, QWidget *parent = nullptr);

@@ -1,16 +1,10 @@
 #pragma once
 
-#include "KaReportExport.h"
+#include "PageSetup.h"
 
-#include <QMargins>
-#include <QSizeF>
-#include <QString>
-#include <QStringList>
 #include <QWidget>
 
 #include <array>
-#include <functional>
-#include <optional>
 #include <vector>
 
 class QComboBox;
@@ -22,34 +16,8 @@ class QVBoxLayout;
 namespace kareport
 {
 
-/// A sheet that a printer takes, upright.
-struct PageSheet
-{
-    QString name;
-    QSize points;
-    QSizeF millimetres;
-};
-
-/// What a page is set up with.
-struct PageSetup
-{
-    QMargins margins; ///< hundredths of a millimetre
-    bool portrait = true;
-    QString printer;      ///< empty for the built-in page device
-    QStringList printers; ///< to choose from
-    QSize sheet;          ///< upright, in points; empty for the printer's own
-    /// Whether there is a report to ask for its pages.
-    bool asksForPages = false;
-    /// The lines of the page that the report was made for; nothing for a report whose page has only been measured.
-    std::optional<int> givenLines;
-    /// Whether each of those pages is printed on a sheet of its own, or as many lines on a sheet as it takes.
-    bool keepsGivenPages = false;
-    /// The sheets that a printer takes, its own first.
-    std::function<std::vector<PageSheet>(const QString &printer)> sheetsOf;
-};
-
 /// Asks for paper, orientation, margins, what a page is and, where there are several, the printer.
-class KAREPORT_EXPORT PageSetupForm : public QWidget
+class PageSetupForm : public QWidget
 {
 public:
     explicit PageSetupForm(const PageSetup &setup, QWidget *parent = nullptr);

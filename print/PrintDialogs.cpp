@@ -1,6 +1,8 @@
 #include "PrintDialogs.h"
 
+#include "PageSetupDialog.h"
 #include "PlainWidgets.h"
+#include "PrintQuestions.h"
 #include "Xlate.h"
 
 #include <QPointer>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "KaReportExport.h"
-#include "PageSetupDialog.h"
+#include "PageSetup.h"
 
 #include <functional>
 
@@ -26,9 +26,5 @@ struct PrintDialogs
 
 /// Installs the windows that print commands ask with; empty ones bring Qt's and our own back.
 KAREPORT_EXPORT void setPrintDialogs(PrintDialogs dialogs);
-
-bool askPrint(QPrinter &printer, int maxPage, QWidget *parent);
-void showPreview(QPrinter &printer, QWidget *parent, const std::function<void(QPrinter &)> &paint);
-bool askPageSetup(PageSetup &setup, QWidget *parent);
 
 } // namespace kareport

@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QMargins>
 #include <QRect>
 #include <QSize>
@@ -12,21 +10,21 @@ namespace kareport
 inline constexpr int twipsPerInch = 1440;
 
 /// A length in hundredths of a millimetre as twips, rounded.
-KAREPORT_EXPORT int twipsOfHundredths(int hundredths);
-KAREPORT_EXPORT QMargins twipsOfHundredths(const QMargins &margins);
+int twipsOfHundredths(int hundredths);
+QMargins twipsOfHundredths(const QMargins &margins);
 /// A sheet in printer dots as twips, cut off. (0, 0) for a sheet that has not been measured, with a resolution of 0.
-KAREPORT_EXPORT QSize twipsOfDots(const QSize &sheet, unsigned resolution);
+QSize twipsOfDots(const QSize &sheet, unsigned resolution);
 /// A length in millimetres as twips, rounded.
-KAREPORT_EXPORT int twipsOfMillimetres(qreal millimetres);
+int twipsOfMillimetres(qreal millimetres);
 
 /// How many pages a print job is expected to have before it is laid out, by the lines that were written: what the print
 /// dialog begins with. How many there are is told by `reportPages`, and by the sheets of the job.
 /// @return 0 for a page without lines, and a number below 0 where the page has fewer than none: there is then no page either
-KAREPORT_EXPORT int expectedPages(int lines, int linesPerPage);
+int expectedPages(int lines, int linesPerPage);
 
 /// What the margins leave of a sheet; a width or height below 0 where they leave nothing.
-KAREPORT_EXPORT QRect printableRect(const QSize &sheet, const QMargins &margins);
+QRect printableRect(const QSize &sheet, const QMargins &margins);
 /// Whether the margins leave room for text: a square of 10 mm at least. Sheet and margins in twips.
-KAREPORT_EXPORT bool leavesRoom(const QSize &sheet, const QMargins &margins);
+bool leavesRoom(const QSize &sheet, const QMargins &margins);
 
 } // namespace kareport

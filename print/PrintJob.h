@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QString>
 
 #include <functional>
@@ -50,7 +48,6 @@ struct PrintOutcome
 /// print queue, and an earlier file as it was.
 /// @param lastPage  stops there, for a preview that cannot hold more, and says in the outcome whether there is a page
 ///                  after it; 0 for no limit
-KAREPORT_EXPORT PrintOutcome printPages(QPrinter &printer, const PrintSource &source, QWidget *parent,
-                                        int lastPage = 0);
+PrintOutcome printPages(QPrinter &printer, const PrintSource &source, QWidget *parent, int lastPage = 0);
 
 } // namespace kareport

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
 #include "ReportPages.h"
 
 #include <QRect>
@@ -25,7 +24,7 @@ struct PrintSheet
 /// has room for the widest row of the text and for every page of `usualLines` lines at most. A page of more lines has its own,
 /// and one that has no room in the smallest type goes on on further sheets.
 /// @param twips  the part of a sheet that takes text
-KAREPORT_EXPORT std::vector<PrintSheet> printSheets(LinePager &pager, const QRect &twips,
-                                                    const std::vector<ReportPage> &pages, qint64 usualLines);
+std::vector<PrintSheet> printSheets(LinePager &pager, const QRect &twips, const std::vector<ReportPage> &pages,
+                                    qint64 usualLines);
 
 } // namespace kareport

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
 #include "PageSetupForm.h"
 
 #include <QSize>
@@ -22,9 +21,9 @@ std::shared_ptr<QPrinter> makeReportPrinter(bool portrait, const QString &title)
 QSize sheetInTwips(const QPrinter &printer);
 
 /// The printers to choose from, and the one that is chosen.
-KAREPORT_EXPORT void fillPrinters(PageSetup &setup);
+void fillPrinters(PageSetup &setup);
 /// Makes an installed printer the one that the application prints on. @param sheet  upright, in points; empty for the
 /// printer's own
-KAREPORT_EXPORT void selectPrinter(const QString &name, const QSize &sheet);
+void selectPrinter(const QString &name, const QSize &sheet);
 
 } // namespace kareport

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
 #include "ReportText.h"
 
 #include <QByteArrayView>
@@ -14,7 +13,7 @@ namespace kareport
 
 /// The text of a report as it was read from a file, and what is known of it: a report takes it over as it is. All of it may
 /// be made on any thread.
-struct KAREPORT_EXPORT LoadedText
+struct LoadedText
 {
     ReportText text;
     qint64 lineEnds = 0;
@@ -36,10 +35,10 @@ enum class TextLoading
 /// Reads the bytes of a report file, as `decodeReportText` does.
 /// @param loaded   as it was made: empty
 /// @param proceed  is told the bytes done; its false stops the work. May be empty
-KAREPORT_EXPORT TextLoading loadReportText(QByteArrayView bytes, LoadedText &loaded,
-                                           const std::function<bool(qint64 done)> &proceed = {});
+TextLoading loadReportText(QByteArrayView bytes, LoadedText &loaded,
+                           const std::function<bool(qint64 done)> &proceed = {});
 /// Reads bytes that are the text in UTF-8, with its own line ends. What is no UTF-8 reads as a sign for that.
-KAREPORT_EXPORT TextLoading loadPlainText(QByteArrayView bytes, LoadedText &loaded,
-                                          const std::function<bool(qint64 done)> &proceed = {});
+TextLoading loadPlainText(QByteArrayView bytes, LoadedText &loaded,
+                          const std::function<bool(qint64 done)> &proceed = {});
 
 } // namespace kareport

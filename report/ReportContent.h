@@ -1,6 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
 #include "RichTextReader.h"
 
 #include <QFont>
@@ -14,28 +13,28 @@ namespace kareport
 {
 
 /// The fixed-pitch font that a report is shown in.
-KAREPORT_EXPORT QFont reportFont(const QString &name, unsigned points);
+QFont reportFont(const QString &name, unsigned points);
 /// The font of a report's view: its face by the 31 characters that the name of a face has at most.
-KAREPORT_EXPORT QFont reportFont(const UReportDoc &report);
+QFont reportFont(const UReportDoc &report);
 
 /// The text that a view shows of a report: its rich text in rich-text mode, else its own.
-KAREPORT_EXPORT QString shownText(const UReportDoc &report);
+QString shownText(const UReportDoc &report);
 
 /// The characters that a view shows of a report, its lines ended by CR LF: of rich text those of the document.
-KAREPORT_EXPORT QString shownPlainText(const UReportDoc &report);
+QString shownPlainText(const UReportDoc &report);
 
 /// Reads the shown text of a report that is rich text into a document. What was loaded from a file is read as the bytes that
 /// it is.
 /// @param text  as `shownText` gives it; it begins as rich text does
 /// @return what is wrong with it; the document then holds what was read up to there
-KAREPORT_EXPORT std::optional<RichTextError> readShownRichText(const UReportDoc &report, const QString &text,
-                                                               QTextDocument &document, RichTextNotes *notes = nullptr);
+std::optional<RichTextError> readShownRichText(const UReportDoc &report, const QString &text, QTextDocument &document,
+                                               RichTextNotes *notes = nullptr);
 
 /// Puts what a report holds into a text document, as its view shows it: the rich text of a report in rich-text mode or of
 /// a text that begins as rich text does, else the plain text in the report's font.
 /// @param notes  receives what rich text is not shown; may be null
 /// @return what is wrong with the rich text; the document then holds what was read up to there
-KAREPORT_EXPORT std::optional<RichTextError> showReportContent(const UReportDoc &report, QTextDocument &document,
-                                                               RichTextNotes *notes = nullptr);
+std::optional<RichTextError> showReportContent(const UReportDoc &report, QTextDocument &document,
+                                               RichTextNotes *notes = nullptr);
 
 } // namespace kareport

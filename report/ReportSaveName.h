@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QString>
 #include <QStringView>
 
@@ -17,12 +15,12 @@ inline const QString lastReportFolder = QStringLiteral("LastOpenDirectoryReport"
 
 /// Whether a file name ends with an extension (".rtf", in small letters), in any case. The first occurrence of the
 /// extension decides: a name that holds it earlier as well does not count as ending with it.
-KAREPORT_EXPORT bool endsWithExtension(QStringView name, QStringView extension);
+bool endsWithExtension(QStringView name, QStringView extension);
 /// Asks for the name of a file to save a report in, beginning with the folder used last, and keeps its folder.
 /// @param richTextFirst  offers rich text before report text
 /// @return nothing when the user has cancelled
-KAREPORT_EXPORT std::optional<QString> askReportName(UDocument &document, bool richTextFirst);
+std::optional<QString> askReportName(UDocument &document, bool richTextFirst);
 /// Says that a report could not be saved, and why. @param reason  empty when it is not known: what to do is said then
-KAREPORT_EXPORT void sayNotSaved(const QString &path, const QString &reason = QString());
+void sayNotSaved(const QString &path, const QString &reason = QString());
 
 } // namespace kareport

@@ -29,7 +29,9 @@ public:
     /// The same as plain text of one byte a character. @return false as soon as a write fails
     virtual bool streamPlainText(QIODevice &device) const = 0;
 
+    /// Whose pane the view stands in; the host's until the report says otherwise.
     Pane pane() const { return pane_; }
+    /// Notes whose pane the view stands in, which the report does that has opened it.
     void setPane(Pane pane) { pane_ = pane; }
 
 private:

@@ -70,6 +70,7 @@ public:
     const char16_t *GetData() const;
     /// The same with its length, for texts that hold a character 0.
     QStringView GetText() const;
+    /// Whether the report has no text.
     bool IsEmpty() const;
     /// Whether a part of what was to be written, or set, since the last `Clear` is missing because memory has ended. Such a
     /// report is not saved, also when nothing is left of it.
@@ -85,7 +86,8 @@ public:
     void SetData(const QString &text);
     /// Takes over a text that was made elsewhere, as on another thread, in a time that does not grow with it. Its lines are
     /// counted as if they had been written, and its pages begin where it says. Neither rich text nor a report window is told
-    /// of it. @param text  is handed the text before it
+    /// of it. Its type is not among the installed headers: it serves the programs of this project.
+    /// @param text  is handed the text before it
     void TakeText(kareport::LoadedText &text);
     /// Replaces a piece of the text as it is, in a time that does not grow with the text. Counters stay; pages begin where
     /// they did before.
@@ -125,8 +127,11 @@ public:
     void WriteHeading();
     /// Builds the header line anew from application, title and the time of now.
     void SetHeader();
+    /// Writes the header line with the page's number where the report is, and the line ends after it.
     void WriteHeader();
+    /// Sets whether every page begins with header and heading.
     void SetHeaderFlag(bool on);
+    /// Whether every page begins with header and heading.
     bool GetHeaderFlag() const;
 
     int GetLineCount() const;  ///< 0: nothing has been written yet
@@ -138,6 +143,7 @@ public:
     /// Switches rich-text mode: while it is on, what is written goes into a rich-text image as well. Without memory for it the
     /// mode stays off, and the report has lost text.
     void SetRTFDataFlag(bool on);
+    /// Whether rich-text mode is on.
     bool GetRTFDataFlag() const;
     /// Cuts a rich-text document down to its paragraph. @return false, with the text as it was, when it has none or memory
     /// ends
@@ -178,6 +184,7 @@ public:
     /// Where pages begin, as the writer recorded it: the places of characters in the text, from 0, in ascending order. A
     /// place that does not stand at the beginning of a line counts for nothing.
     const std::vector<qint64> &GetPageStarts() const;
+    /// Replaces the record of where pages begin. @param starts  in ascending order
     void SetPageStarts(std::vector<qint64> starts);
     /// Takes the page headers in the text from a place on for the page starts there. Nothing where there is none.
     /// @return whether there was one
@@ -185,12 +192,15 @@ public:
     /// The lines, from 0, that pages begin with; text before the first of them has pages by counting lines.
     std::vector<qint64> GetPageStartLines() const;
 
+    /// The lines of a page between the margins; 72 until measured or given.
     int GetLinesPerPage() const;
+    /// The characters of average width between the margins; 80 until measured or given.
     int GetCharsPerRow() const;
     unsigned GetPrintResolution() const; ///< vertical dots per inch; 0: not measured
     QSize GetPageSize() const;           ///< whole sheet in printer dots
     unsigned GetFontSize() const;        ///< points
     void SetFontSize(unsigned points);   ///< does not measure again
+    /// The face of the report; "Lucida Console" until it is set.
     QString GetFontName() const;
     void SetFontName(const QString &name); ///< does not measure again
     /// Hundredths of a millimetre.
@@ -218,9 +228,11 @@ public:
     /// The same from the file at a path.
     bool LoadTemplateFile(const QString &path, const QString &templateName, const QString &tableName,
                           const QString &blockName);
-    /// Loads a table, or a block, of the loaded template in the place of the one before, which is gone also when this
-    /// fails. @return false without a template, when it has no such table or block or not its dictionary, or without memory
+    /// Loads a table of the loaded template in the place of the one before, which is gone also when this fails.
+    /// @return false without a template, when it has no such table or not its dictionary, or without memory
     bool LoadTemplateTable(const QString &tableName);
+    /// Loads a block of the loaded template in the place of the one before, which is gone also when this fails.
+    /// @return false without a template, when it has no such block or not its dictionary, or without memory
     bool LoadTemplateBlock(const QString &blockName);
     /// The loaded template, or null. It is the report's, and goes when another one is loaded.
     const UXmlReportTpl *GetTemplate() const;
@@ -246,12 +258,15 @@ public:
     bool WriteDataTable(const QString &tableName, UDataObjectList *list, int linesBefore, int linesAfter,
                         int headingLinesAfter);
 
+    /// Sets units and display formats of what is written from now on; northing and easting are put in order when a table is loaded.
     void SetJobSettings(const UJobSettings &settings);
+    /// The units and display formats; those of a new job until they are set.
     const UJobSettings &GetJobSettings() const;
     /// Replaces the caption of the chainage column in table headings.
     void SetChainageLabel(const QString &label);
     /// The character between columns; `raw` takes the character 255 instead.
     void SetDataColumnSeparator(char16_t separator, bool raw);
+    /// The character between columns; a blank until it is set or a template loaded.
     char16_t GetDataColumnSeparator() const;
     /// Columns for a spreadsheet: no header, a tab between them.
     void SetExcelFormat();
@@ -259,6 +274,7 @@ public:
     void WriteTableName(bool on);
     /// Whether values of zero print as blanks.
     void SetZeroBlank(bool on);
+    /// Whether values of zero print as blanks; not at first.
     bool IsZeroBlank() const;
     bool GetPageBreaks() const; ///< the loaded template's option
 
@@ -267,7 +283,9 @@ public:
     /// The window style of a pane that a report opens for itself.
     static constexpr unsigned ownPaneStyle = 4096;
 
+    /// The report's title as it was given, to be changed in place: neither header line nor panes follow.
     QString &GetTitle();
+    /// The report's title as it was given, without the number that its panes may show.
     const QString &GetTitle() const;
     /// Sets the title and the header line. While an open pane of another document has the title as its caption, the
     /// document's title gets a number from 2 after it; the header line keeps the title as given. An empty title gets none.
@@ -281,6 +299,7 @@ public:
 
     /// Links a report window, which the document destroys with itself; null takes the link away.
     void SetReportWindow(kareport::ReportWindow *window);
+    /// The linked report window; null for none.
     kareport::ReportWindow *GetReportWindow() const;
     /// Lets the report in its window be saved, printed and opened, and gives the keyboard to the window; nothing without
     /// one.
@@ -299,15 +318,18 @@ public:
 
     /// Marks the report for the user's preferred editor.
     void SetExternalEditorFlag(bool on);
+    /// Whether the report is meant for the user's preferred editor.
     bool GetExternalEditorFlag() const;
     /// Whether the report goes to the user's preferred editor: it is marked for it, and an editor is preferred and
     /// installed. The preferences are looked up each time.
     bool UsePreferredReportEditor() const;
     /// Lets the report go to the spreadsheet as to a word processor.
     void SetOptionExcel();
+    /// Whether `SetOptionExcel` was called.
     bool IsOptionExcel() const;
     /// The rich-text image is for the spreadsheet: it holds the bare texts.
     void SetExternalExcel();
+    /// Whether `SetExternalExcel` was called, by a host or by `IsConvertToOpenInWord`.
     bool IsExternalExcel() const;
     /// Whether a file is to be converted to rich text for an editor: for a word processor, unless it is rich text or a PDF
     /// already. With the Excel option and Excel for an editor, the report is an external Excel's from then on.
@@ -328,6 +350,7 @@ public:
     void ReportRTfData();
     /// The name that temporary files are named after.
     void SetReportFileName(const QString &name);
+    /// The name that temporary files are named after; empty until it is set.
     const QString &GetReportFileName() const;
     /// A temporary name for the report that no report has had; empty when memory ends.
     QString GetCurrentReportFileName() const;
@@ -374,6 +397,7 @@ public:
     /// of the application, not owned; it may go before the report
     void SetTextObject(void *object, unsigned id);
     bool HasTextObj() const; ///< whether the number is not 0
+    /// The host document that takes the edited text; null for none.
     void *GetTextObject() const;
     /// Gives the text that the user edited in the view back to the object that the report was made from.
     void SaveText();
@@ -391,10 +415,13 @@ public:
     int GetCloseDocument() const;
     /// Closes the report as soon as its content has been handed to an editor.
     void SetCloseDocumentFlag(bool on);
+    /// Whether the report closes as soon as it has been handed to an editor.
     bool GetCloseDocumentFlag() const;
     /// 0 forbids closing the report's panes.
     void SetCanClose(int can);
+    /// Switches the report's close option: while it is off, its panes refuse to close and say why.
     void EnableCloseOption(bool on);
+    /// Whether the close option is on, as it is at first.
     bool EnableCloseOption() const;
 
 private:

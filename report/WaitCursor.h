@@ -1,12 +1,10 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 namespace kareport
 {
 
 /// Shows the wait cursor while it lives, in a program with windows.
-class KAREPORT_EXPORT WaitCursor
+class WaitCursor
 {
 public:
     WaitCursor();

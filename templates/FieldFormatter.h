@@ -1,7 +1,6 @@
 #pragma once
 
 #include "FieldMarker.h"
-#include "KaReportExport.h"
 #include "TextBuffer.h"
 #include "UJobSettings.h"
 #include "ValueKind.h"
@@ -22,7 +21,7 @@ struct FormatOptions
 };
 
 /// A field prepared for being formatted row after row.
-class KAREPORT_EXPORT FieldFormatter
+class FieldFormatter
 {
 public:
     explicit FieldFormatter(const sXmlReportField &field);

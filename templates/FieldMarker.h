@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QStringView>
 
 namespace kareport
@@ -15,6 +13,6 @@ enum class FieldMarker
     SuffixR,   ///< "SUFFIX_R": the next field gets the suffix "R"
     SuffixPlus ///< "SUFFIX_+": the next field gets the suffix "+"
 };
-KAREPORT_EXPORT FieldMarker fieldMarker(QStringView variableName);
+FieldMarker fieldMarker(QStringView variableName);
 
 } // namespace kareport

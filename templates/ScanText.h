@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QString>
 #include <QStringView>
 
@@ -12,7 +10,7 @@ namespace kareport
 
 /// A piece of template text that remembers where each of its characters stood in the file, through every cut, so that
 /// a remark about it can name line and column.
-class KAREPORT_EXPORT ScanText
+class ScanText
 {
 public:
     ScanText() = default;

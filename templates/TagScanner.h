@@ -46,14 +46,14 @@ struct ScanElement
 /// short one stood: templates in use are laid out for that.
 /// @param tag    the name in ASCII capitals
 /// @param notes  where to note what an author may not have meant; null for none
-KAREPORT_EXPORT ScanElement ExtractNode(ScanText &text, QStringView tag, bool remove, ScanNotes *notes = nullptr);
+ScanElement ExtractNode(ScanText &text, QStringView tag, bool remove, ScanNotes *notes = nullptr);
 
 /// The first element of a name in a text that stays as it is.
-KAREPORT_EXPORT ScanElement GetNode(const ScanText &text, QStringView tag, ScanNotes *notes = nullptr);
+ScanElement GetNode(const ScanText &text, QStringView tag, ScanNotes *notes = nullptr);
 
 /// The elements of a name in a text, one after the other, as repeated cutting with `ExtractNode` finds them: an empty
 /// element or one that cannot be read ends the sequence. The text is walked once, whatever it holds.
-class KAREPORT_EXPORT NodeSequence
+class NodeSequence
 {
 public:
     /// The text must live as long as the sequence.

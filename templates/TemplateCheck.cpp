@@ -6,7 +6,8 @@
 #include "TemplateElements.h"
 #include "TemplateRecords.h"
 #include "TextFolding.h"
-#include "VariableType.h"
+#include "TextPlaces.h"
+#include "VariableKeywords.h"
 #include "Xlate.h"
 
 #include <QHashFunctions>

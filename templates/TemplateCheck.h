@@ -2,7 +2,7 @@
 
 #include "KaReportExport.h"
 #include "TemplateFile.h"
-#include "TextPlaces.h"
+#include "TextPlace.h"
 
 #include <QString>
 
@@ -15,7 +15,7 @@ namespace kareport
 /// Something in a template file that is read in another way than it looks, or not at all.
 struct TemplateRemark
 {
-    TextPlace place;
+    TextPlace place;      ///< in the file
     bool isError = false; ///< the report would come out wrong; otherwise it may be meant
     QString text;         ///< one sentence, translated
 };

@@ -1,5 +1,7 @@
 #include "TemplateFile.h"
 
+#include "ScanText.h"
+
 #include <QByteArray>
 #include <QFile>
 #include <QUtf8StringView>

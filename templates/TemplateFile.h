@@ -1,7 +1,6 @@
 #pragma once
 
 #include "KaReportExport.h"
-#include "ScanText.h"
 
 #include <QByteArray>
 #include <QByteArrayView>
@@ -12,11 +11,14 @@
 namespace kareport
 {
 
+class ScanText;
+
 /// The text of a template file: UTF-8 when the whole file is valid UTF-8, else Latin-1. The file counts as read in
 /// chunks of 4095 bytes, and a zero byte ends its chunk's text.
 class KAREPORT_EXPORT TemplateFile
 {
 public:
+    /// The text of the bytes of a file.
     explicit TemplateFile(QByteArrayView bytes);
 
     /// Reads a file; nothing when it cannot be opened or read.

@@ -2,11 +2,12 @@
 
 #include "LeadingInteger.h"
 #include "MemoryLasts.h"
+#include "ScanText.h"
 #include "TemplateElements.h"
 #include "TemplateFile.h"
 #include "TemplateRecords.h"
 #include "TextFolding.h"
-#include "VariableType.h"
+#include "VariableKeywords.h"
 
 #include <algorithm>
 #include <optional>
@@ -30,7 +31,7 @@ auto findByName(const Records &records, Member member, const QString &name) -> d
 
 } // namespace
 
-UXmlReportTpl::UXmlReportTpl()
+UXmlReportTpl::UXmlReportTpl() : xml_(std::make_unique<kareport::ScanText>())
 {
     CleanData(false);
 }
@@ -45,7 +46,7 @@ bool UXmlReportTpl::LoadTemplate(const QString &fileName, const QString &templat
             return false;
         }
         name_ = templateName;
-        xml_ = kareport::ScanText(*text);
+        *xml_ = kareport::ScanText(*text);
         return ReadXmlData();
     });
     if (!isLoaded) {
@@ -56,14 +57,19 @@ bool UXmlReportTpl::LoadTemplate(const QString &fileName, const QString &templat
 
 bool UXmlReportTpl::SetXml(const QString &xml)
 {
-    xml_ = kareport::ScanText(xml);
+    *xml_ = kareport::ScanText(xml);
     return ReadXmlData();
+}
+
+QString UXmlReportTpl::GetXml() const
+{
+    return xml_->text();
 }
 
 bool UXmlReportTpl::ReadXmlData()
 {
     CleanData(true);
-    if (xml_.isEmpty() || !ReadTemplatesAvailable()) {
+    if (xml_->isEmpty() || !ReadTemplatesAvailable()) {
         return false;
     }
     if (!ReadTables() || !ReadDictionary() || !ReadBlocks() || !ReadOptions()) {
@@ -79,7 +85,7 @@ bool UXmlReportTpl::ReadXmlData()
 bool UXmlReportTpl::ReadTemplatesAvailable()
 {
     std::optional<kareport::ScanText> chosen; // the last one of the name
-    kareport::TemplateSequence sequence(xml_);
+    kareport::TemplateSequence sequence(*xml_);
     while (auto element = sequence.next()) {
         templates_.push_back({element->name.value.text(), element->title.value.text()});
         if (equalFolded(element->name.value.view(), name_)) {
@@ -89,13 +95,13 @@ bool UXmlReportTpl::ReadTemplatesAvailable()
     if (!chosen) {
         return false;
     }
-    xml_ = *std::move(chosen);
+    *xml_ = *std::move(chosen);
     return true;
 }
 
 bool UXmlReportTpl::ReadTables()
 {
-    for (const auto &element : kareport::readTableElements(xml_)) {
+    for (const auto &element : kareport::readTableElements(*xml_)) {
         sXmlReportTable table{element.name.value.text(), element.use.value.text(), {}};
         table.Fields.reserve(element.fields.size());
         std::transform(element.fields.begin(), element.fields.end(), std::back_inserter(table.Fields),
@@ -108,7 +114,7 @@ bool UXmlReportTpl::ReadTables()
 
 bool UXmlReportTpl::ReadBlocks()
 {
-    for (const auto &element : kareport::readBlockElements(xml_)) {
+    for (const auto &element : kareport::readBlockElements(*xml_)) {
         sXmlReportBlock block{element.name.value.text(), element.use.value.text(), {}};
         block.Fields.reserve(element.fields.size());
         std::transform(element.fields.begin(), element.fields.end(), std::back_inserter(block.Fields),
@@ -121,7 +127,7 @@ bool UXmlReportTpl::ReadBlocks()
 
 bool UXmlReportTpl::ReadDictionary()
 {
-    for (const auto &element : kareport::readDictionaryElements(xml_)) {
+    for (const auto &element : kareport::readDictionaryElements(*xml_)) {
         sXmlReportDictionary dictionary{element.name.value.text(), {}};
         auto &infos = variables_[foldedKey(dictionary.DictionaryName)];
         for (const auto &variable : element.variables) {
@@ -141,7 +147,7 @@ bool UXmlReportTpl::ReadDictionary()
 
 bool UXmlReportTpl::ReadOptions()
 {
-    const auto elements = kareport::readOptionElements(xml_);
+    const auto elements = kareport::readOptionElements(*xml_);
     option_.Separator = kareport::ParseSeparatorOption(elements.separator.value.view());
     option_.PageBreaks = !equalFolded(elements.pageBreaks.value.view(), u"NO");
     return true;
@@ -149,7 +155,7 @@ bool UXmlReportTpl::ReadOptions()
 
 void UXmlReportTpl::ReadSortData()
 {
-    for (const auto &element : kareport::readSortElements(xml_)) {
+    for (const auto &element : kareport::readSortElements(*xml_)) {
         sXmlSortTableReport list{element.name.value.text(), element.use.value.text(), {}};
         for (const auto &name : element.variableNames) {
             list.Entries.push_back({name.value.text(), 0});
@@ -240,7 +246,7 @@ void UXmlReportTpl::CleanData(bool keepText)
     variables_.clear();
     option_ = sXmlReportOption();
     if (!keepText) {
-        xml_ = kareport::ScanText();
+        *xml_ = kareport::ScanText();
         name_.clear();
     }
 }

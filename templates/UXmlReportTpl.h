@@ -2,7 +2,6 @@
 
 #include "KaReportExport.h"
 #include "OrientationOrder.h"
-#include "ScanText.h"
 #include "sXmlReportBlock.h"
 #include "sXmlReportDictionary.h"
 #include "sXmlReportOption.h"
@@ -14,8 +13,14 @@
 #include <QString>
 #include <QStringList>
 
+#include <memory>
 #include <unordered_map>
 #include <vector>
+
+namespace kareport
+{
+class ScanText;
+}
 
 /// One report template, read from a file that may hold several. Names are compared without regard to case.
 ///
@@ -37,21 +42,31 @@ public:
     /// The title of the chosen template: of several with its name, the first one's; "" when no template has the name.
     QString GetTemplateTitle() const;
 
-    // Each replaces the content of the list that it fills.
-    void GetAllTPLsByName(QStringList &names) const;   ///< all templates of the file, in file order
-    void GetAllTPLsByTitle(QStringList &titles) const; ///< all templates of the file, in file order
+    /// Replaces the list by the names of all templates of the file, in file order.
+    void GetAllTPLsByName(QStringList &names) const;
+    /// Replaces the list by the titles of all templates of the file, in file order.
+    void GetAllTPLsByTitle(QStringList &titles) const;
+    /// Replaces the list by the names of the chosen template's tables, in file order.
     void GetAllTables(QStringList &names) const;
+    /// Replaces the list by the names of the chosen template's blocks, in file order.
     void GetAllBlocks(QStringList &names) const;
+    /// Replaces the list by the names of the chosen template's dictionaries, in file order.
     void GetAllDictionaries(QStringList &names) const;
 
+    /// The page options of the chosen template; never null.
     const sXmlReportOption *GetOption() const { return &option_; }
+    /// The column separator of the options, Latin-1; 0 for a template that names none.
     char GetSeparatorXmlOption() const { return option_.Separator; }
+    /// Whether the options allow page breaks.
     bool GetPageBreakXmlOption() const { return option_.PageBreaks; }
 
-    // The first record of a name; null for an empty name or when there is none.
+    /// The first table of a name; null for an empty name or when there is none.
     const sXmlReportTable *GetTable(const QString &name) const;
+    /// The first block of a name; null for an empty name or when there is none.
     const sXmlReportBlock *GetBlock(const QString &name) const;
+    /// The first dictionary of a name; null for an empty name or when there is none.
     const sXmlReportDictionary *GetDictionary(const QString &name) const;
+    /// The sort keys of a table; null for an empty name or a table without any.
     const sXmlSortTableReport *GetSortList(const QString &tableName) const;
 
     /// Gives a dictionary variable's identifier and type, as the fields that name it get them: of several dictionaries
@@ -65,7 +80,7 @@ public:
 
 private:
     bool SetXml(const QString &xml);
-    QString GetXml() const { return xml_.text(); }
+    QString GetXml() const;
 
     bool ReadXmlData();
     bool ReadTemplatesAvailable();
@@ -90,7 +105,7 @@ private:
     const Variables *variablesOf(const QString &dictionaryName) const;
     static bool GetDicInfo(const Variables *variables, const QString &variableName, qint32 &id, qint32 &type);
 
-    kareport::ScanText xml_; ///< after loading, the body of the chosen template
+    std::unique_ptr<kareport::ScanText> xml_; ///< after loading, the body of the chosen template
     QString name_;
     QStringList tableNames_;
     QStringList dictionaryNames_;

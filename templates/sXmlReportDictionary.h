@@ -7,14 +7,14 @@
 /// A variable of a dictionary.
 struct sXmlReportVariable
 {
-    QString VariableName;
-    qint32 ID = 0;
-    qint32 Type = 0; ///< a `VARIABLE_TYPE`
+    QString VariableName; ///< by which fields and sort keys name it
+    qint32 ID = 0;        ///< under which data objects hold its value
+    qint32 Type = 0;      ///< a `VARIABLE_TYPE`
 };
 
 /// Gives variable names their identifiers and value types.
 struct sXmlReportDictionary
 {
-    QString DictionaryName;
-    std::vector<sXmlReportVariable> Variables;
+    QString DictionaryName;                    ///< by which tables and blocks name it
+    std::vector<sXmlReportVariable> Variables; ///< in file order
 };

@@ -16,4 +16,5 @@ struct sXmlReportField
     qint32 Type = 0;      ///< value type code from the dictionary; -1 until merged
 };
 
+/// The fields of a table or block, in order.
 using sXmlReportFields = std::vector<sXmlReportField>;

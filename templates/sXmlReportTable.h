@@ -5,7 +5,7 @@
 /// A table of a template: one row for each object under a heading.
 struct sXmlReportTable
 {
-    QString Name;
-    QString Use; ///< the name of its dictionary
-    sXmlReportFields Fields;
+    QString Name;            ///< by which it is written
+    QString Use;             ///< the name of its dictionary
+    sXmlReportFields Fields; ///< a column of the table each, from the left
 };

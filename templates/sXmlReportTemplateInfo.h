@@ -5,6 +5,6 @@
 /// A template of a template file.
 struct sXmlReportTemplateInfo
 {
-    QString Name;
-    QString Title;
+    QString Name;  ///< by which it is loaded
+    QString Title; ///< of the reports that are written through it
 };

@@ -1,7 +1,6 @@
 #pragma once
 
 #include "CommandTarget.h"
-#include "KaReportExport.h"
 
 #include <QToolBar>
 
@@ -9,7 +8,7 @@ class UXTPMDIFrameWnd;
 
 /// The bar of the report window: Save, View\Edit Report and Print. Its buttons follow the window that owns it, not the main
 /// frame.
-class KAREPORT_EXPORT CReportToolBar : public QToolBar
+class CReportToolBar : public QToolBar
 {
 public:
     enum DockingMode

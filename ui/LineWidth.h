@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QFontMetricsF>
 #include <QString>
 #include <QStringView>
@@ -16,11 +14,11 @@ namespace kareport
 
 /// A line as a list shows it: without its line end, a tab as blanks up to the next eighth column, and every other control
 /// character as one blank.
-KAREPORT_EXPORT QString shownLine(QStringView line);
+QString shownLine(QStringView line);
 
 /// Measures lines as they are shown in one font. In a font of one pitch the widths of the characters are added up, which is
 /// many times faster than laying the line out.
-class KAREPORT_EXPORT LineWidth
+class LineWidth
 {
 public:
     LineWidth(const QFont &font, const QPaintDevice *device);

@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QAbstractListModel>
 
 #include <cstddef>
@@ -15,7 +13,7 @@ namespace kareport
 /// `publish`, so that a line costs what it is long, however many there are.
 ///
 /// Lines of one-byte characters, as nearly all are, take a byte a character.
-class KAREPORT_EXPORT ReportLines : public QAbstractListModel
+class ReportLines : public QAbstractListModel
 {
 public:
     explicit ReportLines(QObject *parent = nullptr);

@@ -12,11 +12,11 @@ namespace kareport
 /// The menus of a report in a menu bar, which owns them.
 struct ReportMenu
 {
-    QMenu *file = nullptr;
-    QMenu *edit = nullptr;
-    QMenu *view = nullptr;
-    QMenu *window = nullptr;
-    QMenu *help = nullptr;
+    QMenu *file = nullptr;   ///< New to Exit
+    QMenu *edit = nullptr;   ///< Undo to Paste
+    QMenu *view = nullptr;   ///< Toolbar and Status Bar
+    QMenu *window = nullptr; ///< New Window to Arrange Icons
+    QMenu *help = nullptr;   ///< Help and About
 };
 
 /// Adds the menus of a report to a menu bar: File, Edit, View, Window and Help, in the user's language. Their commands go

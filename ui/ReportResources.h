@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QFont>
 #include <QIcon>
 #include <QRect>
@@ -22,11 +20,11 @@ inline constexpr unsigned commandPrintReport = 11011;
 inline constexpr unsigned reportToolBar = 11018;
 
 /// The untranslated text of a number; empty for a number that has none.
-KAREPORT_EXPORT const char *reportString(unsigned number);
+const char *reportString(unsigned number);
 
 /// The icon of a report command: drawn as lines in the colour of the text, so that it reads on light and dark at any size
 /// and resolution. Null for a command that has none.
-KAREPORT_EXPORT QIcon reportIcon(unsigned command);
+QIcon reportIcon(unsigned command);
 
 /// A bar: the size of its buttons in pixels, and their commands in order.
 struct ToolBarResource
@@ -36,7 +34,7 @@ struct ToolBarResource
 };
 
 /// The bar of a number; without commands for a number that has none.
-KAREPORT_EXPORT ToolBarResource reportBar(unsigned number);
+ToolBarResource reportBar(unsigned number);
 
 /// A dialog with one control. Sizes are in dialog units: quarters of an average character and eighths of a line of its font.
 struct DialogResource
@@ -51,9 +49,9 @@ struct DialogResource
 };
 
 /// The dialog of a number; empty for a number that has none.
-KAREPORT_EXPORT DialogResource reportDialog(unsigned number);
+DialogResource reportDialog(unsigned number);
 
 /// A place in dialog units in pixels. @param font  the dialog's, on the screen that shows it
-KAREPORT_EXPORT QRect pixelsOfDialogUnits(const QRect &units, const QFontMetrics &font);
+QRect pixelsOfDialogUnits(const QRect &units, const QFontMetrics &font);
 
 } // namespace kareport

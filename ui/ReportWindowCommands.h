@@ -2,11 +2,15 @@
 
 #include "CommandTarget.h"
 
+class UReportDoc;
 class UReportView;
 class UReportWindowDlg;
 
 namespace kareport
 {
+
+/// The first view of a report that shows its text; null for none.
+UReportView *firstReportView(const UReportDoc &report);
 
 /// What the commands of a report's menus do while a report window has the keyboard: they act on the report that it shows, or
 /// are disabled. None of them goes on to a view of another report.

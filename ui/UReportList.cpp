@@ -1,5 +1,6 @@
 #include "UReportList.h"
 
+#include "LineWidth.h"
 #include "MemoryLasts.h"
 #include "ReportEdit.h"
 #include "ReportLines.h"
@@ -46,7 +47,9 @@ int positionAfter(unsigned code, int current, int position)
 } // namespace
 
 UReportList::UReportList(QWidget *parent)
-    : QListView(parent), lines_(new kareport::ReportLines(this)), lineWidth_(font(), viewport())
+    : QListView(parent),
+      lines_(new kareport::ReportLines(this)),
+      lineWidth_(std::make_unique<kareport::LineWidth>(font(), viewport()))
 {
     setModel(lines_);
     setUniformItemSizes(true);
@@ -98,7 +101,7 @@ int UReportList::AddString(QStringView line)
     if (!lines_->append(line)) {
         return -1;
     }
-    extent_ = std::max(extent_, lineWidth_.of(line));
+    extent_ = std::max(extent_, lineWidth_->of(line));
     if (!flushTimer_.isActive()) {
         flushTimer_.start();
     }
@@ -142,11 +145,11 @@ void UReportList::flush()
 
 void UReportList::measureAgain()
 {
-    lineWidth_ = kareport::LineWidth(font(), viewport());
-    rowHeight_ = lineWidth_.lineHeight() + 1;
+    *lineWidth_ = kareport::LineWidth(font(), viewport());
+    rowHeight_ = lineWidth_->lineHeight() + 1;
     extent_ = 0;
     for (int row = 0; row < lines_->count(); ++row) {
-        extent_ = std::max(extent_, lineWidth_.of(lines_->line(row)));
+        extent_ = std::max(extent_, lineWidth_->of(lines_->line(row)));
     }
     scheduleDelayedItemsLayout();
 }

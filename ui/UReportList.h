@@ -1,15 +1,17 @@
 #pragma once
 
 #include "KaReportExport.h"
-#include "LineWidth.h"
 
 #include <QListView>
 #include <QTimer>
 
+#include <memory>
+
 namespace kareport
 {
+class LineWidth;
 class ReportLines;
-}
+} // namespace kareport
 
 /// The list of a report window: one row a line, all of one height, as wide as its widest line. A line is never cut or
 /// abbreviated; what does not fit is reached with the horizontal scroll bar.
@@ -29,6 +31,7 @@ public:
         thumbTrack = 5
     };
 
+    /// A list without lines, which `Create` gives its place. @param parent  owns it; may be null
     explicit UReportList(QWidget *parent = nullptr);
     ~UReportList() override;
 
@@ -46,6 +49,7 @@ public:
     /// Adds a line behind the last; the current one stays. The list becomes as wide as the line, if it is not.
     /// @return its row, or −1 when there is no memory
     int AddString(QStringView line);
+    /// How many lines were added.
     int GetCount() const;
     /// A line as it was added; empty for a row that is not there.
     QString GetText(int row) const;
@@ -67,6 +71,7 @@ public:
     /// @param code      a `ScrollCode`; every other is ignored
     /// @param position  for the thumb codes
     void OnHScroll(unsigned code, int position, QScrollBar *bar = nullptr);
+    /// The same for the vertical scroll bar.
     void OnVScroll(unsigned code, int position, QScrollBar *bar = nullptr);
     /// Gives the scroll bars the range that the inside and the content cover together, and a page of the inside. They
     /// follow the lines again as soon as these are laid out.
@@ -76,12 +81,17 @@ public:
 
     // --- View -------------------------------------------------------------------------------------------------------
 
+    ///@{
+    /// As those of `QListView`, worked out from the one height that all rows have.
     QRect visualRect(const QModelIndex &index) const override;
     QModelIndex indexAt(const QPoint &point) const override;
     void scrollTo(const QModelIndex &index, ScrollHint hint = EnsureVisible) override;
     void doItemsLayout() override;
+    ///@}
 
 protected:
+    ///@{
+    /// As those of `QListView`, worked out from the one height that all rows have.
     bool event(QEvent *event) override;
     void changeEvent(QEvent *event) override;
     void keyPressEvent(QKeyEvent *event) override;
@@ -95,6 +105,7 @@ protected:
     int horizontalOffset() const override;
     int verticalOffset() const override;
     bool isIndexHidden(const QModelIndex &index) const override;
+    ///@}
 
 private:
     void flush();
@@ -105,7 +116,7 @@ private:
     QRect rowsRect(int first, int last) const;
 
     kareport::ReportLines *lines_;
-    kareport::LineWidth lineWidth_;
+    std::unique_ptr<kareport::LineWidth> lineWidth_;
     QTimer flushTimer_;
     int rowHeight_ = 1; ///< pixels
     int extent_ = 0;    ///< pixels

@@ -1,6 +1,7 @@
 // How the list lays its rows out: they are all of one height, so that every place in it is a matter of arithmetic and none
 // of it is kept for each row.
 
+#include "LineWidth.h"
 #include "UReportList.h"
 
 #include "ReportLines.h"
@@ -83,7 +84,7 @@ void UReportList::doItemsLayout()
 
 void UReportList::updateGeometries()
 {
-    horizontalScrollBar()->setSingleStep(std::max(1, qRound(lineWidth_.characterWidth())));
+    horizontalScrollBar()->setSingleStep(std::max(1, qRound(lineWidth_->characterWidth())));
     horizontalScrollBar()->setPageStep(viewport()->width());
     horizontalScrollBar()->setRange(0, std::max(0, contentWidth() - viewport()->width()));
     const int page = viewport()->height();

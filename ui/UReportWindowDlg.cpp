@@ -2,6 +2,7 @@
 
 #include "CReportToolBar.h"
 #include "PageDefaults.h"
+#include "RememberedView.h"
 #include "ReportContent.h"
 #include "ReportResources.h"
 #include "ReportWindowBody.h"
@@ -50,7 +51,8 @@ UReportWindowDlg::UReportWindowDlg()
           {kareport::commandPrintReport, [this] { OnPrint(); },
            [this](kareport::CommandState &state) { OnUpdatePrint(state); }},
       },
-      menuCommands_(std::make_unique<kareport::ReportWindowCommands>(*this))
+      menuCommands_(std::make_unique<kareport::ReportWindowCommands>(*this)),
+      previousView_(std::make_unique<kareport::RememberedView>())
 {}
 
 UReportWindowDlg::~UReportWindowDlg()
@@ -80,7 +82,7 @@ bool UReportWindowDlg::createAt(Qt::DockWidgetArea area, const QString &title, U
     }
     MakeDock();
     body_ = new kareport::ReportWindowBody(this);
-    previousView_ = kareport::RememberedView(previousView);
+    *previousView_ = kareport::RememberedView(previousView);
     HandleInitDialog();
     SetReportDoc(report_);
 
@@ -241,7 +243,12 @@ void UReportWindowDlg::takeFocus()
     }
 }
 
+UView *UReportWindowDlg::GetPreviousView() const
+{
+    return previousView_->get();
+}
+
 void UReportWindowDlg::ActivatePreviousView()
 {
-    previousView_.bringToTop();
+    previousView_->bringToTop();
 }

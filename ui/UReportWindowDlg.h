@@ -3,7 +3,6 @@
 #include "CPropertyPane.h"
 #include "CommandTarget.h"
 #include "KaReportExport.h"
-#include "RememberedView.h"
 #include "ReportWindow.h"
 
 #include <QPointer>
@@ -20,11 +19,9 @@ class UReportView;
 
 namespace kareport
 {
+class RememberedView;
 class ReportWindowBody;
 class ReportWindowCommands;
-
-/// The first view of a report that shows its text; null for none.
-UReportView *firstReportView(const UReportDoc &report);
 } // namespace kareport
 
 /// The report window: a pane at the bottom of the main frame that shows the lines of a report as they are written, with
@@ -79,20 +76,22 @@ public:
     /// Adds the lines of the report's text: without the blanks they begin with, and without empty ones. Lines that the list
     /// has stay.
     void UpdateDocumentData();
-    /// The list, and the bar, of a window that is created; else null.
+    /// The list of a window that is created; else null.
     UReportList *GetList() const;
+    /// The bar of a window that is created; else null.
     CReportToolBar *GetToolBar() const;
 
     // --- Commands ---------------------------------------------------------------------------------------------------
 
     void setActive(bool active) override;
+    /// What `setActive` was given last; false at first.
     bool IsActive() const { return active_; }
     /// Whether the user has closed the window and answered that the report is not to be saved. What is written or edited
     /// after the answer takes it back.
     bool IsGivenUp() const;
     void takeFocus() override;
     /// The view to go back to; null for none or when it has gone.
-    UView *GetPreviousView() const { return previousView_.get(); }
+    UView *GetPreviousView() const;
     /// Brings the pane of that view to the front.
     void ActivatePreviousView();
 
@@ -100,14 +99,18 @@ public:
     void OnSave();
     /// Closes the window and prints the report from a view of its own.
     void OnPrint();
+    /// The command View\\Edit Report: `ShowReport`.
     void OnShowReport() { ShowReport(); }
     /// Closes the window and opens the report in its view or in the user's preferred editor.
     void ShowReport();
     /// Closes the window; when the report is modified, after asking whether to save it.
     void OnPressCloseButton();
 
+    /// Enables Save while the window is active and its report modified, and marks the caption of an active window.
     void OnUpdateSave(kareport::CommandState &state);
+    /// Enables Print while the window is active.
     void OnUpdatePrint(kareport::CommandState &state);
+    /// Enables View\\Edit Report while the window is active.
     void OnUpdateShowReport(kareport::CommandState &state);
     const std::vector<kareport::Command> &commands() const override { return commands_; }
 
@@ -120,7 +123,7 @@ private:
     std::vector<kareport::Command> commands_;
     std::unique_ptr<kareport::ReportWindowCommands> menuCommands_;
     UReportDoc *report_ = nullptr; ///< may have gone
-    kareport::RememberedView previousView_;
+    std::unique_ptr<kareport::RememberedView> previousView_;
     bool active_ = false;
     std::optional<std::pair<quint64, qint64>> givenUp_; ///< the edits and the length of the report that was given up
     QObject life_; ///< to see whether a question to the user has outlasted the window

@@ -1,3 +1,5 @@
+#include "RememberedView.h"
+#include "ReportWindowCommands.h"
 #include "UReportWindowDlg.h"
 
 #include "AppMessageBox.h"
@@ -11,7 +13,10 @@
 #include "UReportView.h"
 #include "Xlate.h"
 
-UReportView *kareport::firstReportView(const UReportDoc &report)
+namespace kareport
+{
+
+UReportView *firstReportView(const UReportDoc &report)
 {
     for (UView *view : report.GetViews()) {
         if (auto *reportView = dynamic_cast<UReportView *>(view)) {
@@ -20,6 +25,8 @@ UReportView *kareport::firstReportView(const UReportDoc &report)
     }
     return nullptr;
 }
+
+} // namespace kareport
 
 void UReportWindowDlg::OnUpdateSave(kareport::CommandState &state)
 {
@@ -65,7 +72,7 @@ void UReportWindowDlg::leaveForReport()
 {
     UReportDoc::ShowReportBar(this, false);
     ClosePane();
-    previousView_.reactivate();
+    previousView_->reactivate();
 }
 
 void UReportWindowDlg::OnPrint()
@@ -149,5 +156,5 @@ void UReportWindowDlg::OnPressCloseButton()
         UReportDoc::ShowReportBar(this, false);
     }
     ClosePane();
-    previousView_.reactivate();
+    previousView_->reactivate();
 }

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
 #include "MatchCounter.h"
 #include "TextSearch.h"
 
@@ -17,7 +16,7 @@ namespace kareport
 class ReportEdit;
 
 /// The bar that finds a text in a report. It is hidden until it is opened.
-class KAREPORT_EXPORT FindBar : public QWidget
+class FindBar : public QWidget
 {
 public:
     /// @param edit  must live as long as the bar

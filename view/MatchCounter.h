@@ -1,6 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
 #include "TextSearch.h"
 
 #include <QTextBlock>
@@ -16,7 +15,7 @@ namespace kareport
 {
 
 /// Counts the matches of a search in a document, a slice at a time between the user's doings.
-class KAREPORT_EXPORT MatchCounter
+class MatchCounter
 {
 public:
     /// @param counted  called after every slice

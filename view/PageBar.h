@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QWidget>
 
 #include <functional>
@@ -13,7 +11,7 @@ namespace kareport
 {
 
 /// The bar that asks for a page to go to. It is hidden until it is opened.
-class KAREPORT_EXPORT PageBar : public QWidget
+class PageBar : public QWidget
 {
 public:
     /// @param go     called with the page that was chosen

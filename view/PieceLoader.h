@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QString>
 #include <QTextDocument>
 #include <QTimer>
@@ -21,7 +19,7 @@ struct PiecedText
 
 /// Fills a text document piece by piece, so that the window answers while a long report is loaded. What has been loaded
 /// ends with a line end until all of it is there.
-class KAREPORT_EXPORT PieceLoader
+class PieceLoader
 {
 public:
     /// @param document  empty, without undo steps; must live as long as the loader

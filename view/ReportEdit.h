@@ -1,6 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
 #include "PieceLoader.h"
 #include "ReportChange.h"
 #include "RichTextReader.h"
@@ -22,7 +21,7 @@ namespace kareport
 ///
 /// It is a plain text control, which alone keeps up with reports of hundreds of thousands of lines. Formats of characters
 /// are drawn; formats of paragraphs stay in its document, from which they are saved again.
-class KAREPORT_EXPORT ReportEdit : public QPlainTextEdit
+class ReportEdit : public QPlainTextEdit
 {
 public:
     explicit ReportEdit(QWidget *parent = nullptr);
@@ -142,6 +141,6 @@ private:
 };
 
 /// Says that there was no memory for a copy.
-KAREPORT_EXPORT void sayNotCopied();
+void sayNotCopied();
 
 } // namespace kareport

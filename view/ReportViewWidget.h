@@ -1,6 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
 #include "PageLines.h"
 
 #include <QTimer>
@@ -22,7 +21,7 @@ struct ReportChange;
 
 /// The window of a report view: the text, the bars that find a text and go to a page, and a line that says where the
 /// cursor is.
-class KAREPORT_EXPORT ReportViewWidget : public QWidget
+class ReportViewWidget : public QWidget
 {
 public:
     explicit ReportViewWidget(QWidget *parent = nullptr);

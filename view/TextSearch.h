@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QString>
 #include <QStringMatcher>
 #include <QStringView>
@@ -10,7 +8,7 @@ namespace kareport
 {
 
 /// Finds a text within lines. Matches of one line do not overlap: they are counted from the left.
-class KAREPORT_EXPORT TextSearch
+class TextSearch
 {
 public:
     TextSearch() = default;

@@ -46,10 +46,11 @@ struct PrintInfo
 class KAREPORT_EXPORT UReportView : public UView, public kareport::ReportViewPort, public kareport::CommandTarget
 {
 public:
+    /// Where lines that are too long for the window end.
     enum WordWrap
     {
-        WrapNone = 0,
-        WrapToWindow = 1
+        WrapNone = 0,    ///< outside the window
+        WrapToWindow = 1 ///< on the next line of the window
     };
 
     UReportView();
@@ -60,6 +61,7 @@ public:
     QWidget *GetWidget() override;
     /// The control that holds the text.
     kareport::ReportEdit &GetEdit() const;
+    /// How lines are wrapped; not at all at first.
     WordWrap GetWordWrap() const { return m_nWordWrap; }
     /// Whether the text was rich text when it was loaded: its formats may then stand in the control alone.
     bool ShowsFormats() const { return showsFormats_; }
@@ -78,12 +80,15 @@ public:
     void SetRTFText(const QString &text);
     /// Takes over the whole text of the control.
     void OnChange();
+    /// Makes the report the one that the user works with (`UApplication::SetCurrentReport`), when the keyboard comes to the view.
     void OnSetFocus();
     /// A press of the mouse in the view's window makes the view the active one of the frame that it stands in.
     void OnMouseActivate();
+    /// Takes the view from the frame that it is the active one of; called when its window goes.
     void OnDestroy();
     /// Closes the application, and the report's window with it.
     void OnReportExit();
+    /// Gives the edited text back to the object that the report was made from (`UReportDoc::SaveText`).
     void OnSaveReportText();
     /// The report can be closed unless its close option is off.
     void OnUpdateCloseCmdUI(kareport::CommandState &state) const;
@@ -96,14 +101,18 @@ public:
     // Printing
     /// @param direct  prints on the prepared printer without asking for printer and pages
     void OnReportPrint(bool direct = false);
+    /// Shows the pages as they would be printed; nothing is printed unless the user says so there.
     void OnReportPrintPreview();
+    /// Asks for paper, orientation and margins, keeps them as preferences and measures the page of the report again.
     void OnPageSetup();
     /// Prepares a job: page count, margins, paper, printer. A report whose page was given has the sheets that its pages take
     /// for pages. @return false cancels it
     bool OnPreparePrinting(kareport::PrintInfo &info);
     /// Begins the table of page starts: with the first page, or with all sheets of a report whose page was given.
     void OnBeginPrinting(QPainter &painter, kareport::PrintInfo &info);
+    /// Ends a job: forgets its table of page starts.
     void OnEndPrinting(QPainter &painter, kareport::PrintInfo &info);
+    /// Lays the pages out up to `info.curPage`; sets `info.maxPage` when the text ends before it.
     void OnPrepareDC(QPainter &painter, kareport::PrintInfo &info);
     /// Prints the page `info.curPage`. Throws std::invalid_argument for a page whose start is not known.
     void OnPrint(QPainter &painter, kareport::PrintInfo &info);
@@ -113,7 +122,9 @@ public:
     /// Draws the margins and line places of a page, to look at the print geometry.
     void DrawMargins(QPainter &painter);
 
+    /// The margins of the job, in twips (1/1440 inch).
     const QMargins &GetPrintMargins() const { return m_rectMargin; }
+    /// The sheet of the job, in twips (1/1440 inch).
     const QSize &GetPaperSize() const { return m_sizePaper; }
     /// The first character of each page that is known, page 1 first.
     const std::vector<qint64> &GetPageStarts() const { return m_aPageStart; }

@@ -1,3 +1,4 @@
+#include "PrintQuestions.h"
 #include "UReportView.h"
 
 #include "AppMessageBox.h"

@@ -1,9 +1,9 @@
 #include "Commands.h"
+#include "VariableKeywords.h"
 
 #include "TemplateNames.h"
 #include "TemplateSource.h"
 #include "UXmlReportTpl.h"
-#include "VariableType.h"
 
 #include <QJsonArray>
 #include <QJsonDocument>

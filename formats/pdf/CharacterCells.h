@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QStringView>
 
 namespace kareport
@@ -10,15 +8,15 @@ namespace kareport
 /// The cells that a character takes on a grid of fixed pitch: 2 for one that East Asian typography sets wide or full
 /// width; 0 for a combining mark, for a Hangul vowel or final consonant that joins the syllable before it, and for a
 /// character that only directs others and is not seen; 1 for any other.
-KAREPORT_EXPORT int cellsOf(char32_t character);
+int cellsOf(char32_t character);
 
 /// Whether a character directs others and is never seen itself: joiners, direction marks, variation selectors.
-KAREPORT_EXPORT bool isIgnorable(char32_t character);
+bool isIgnorable(char32_t character);
 
 /// The cells of a line.
-KAREPORT_EXPORT qint64 cellsOf(QStringView line);
+qint64 cellsOf(QStringView line);
 
 /// The end of the cluster that begins at `begin`: a character with the ones after it that take no cell of their own.
-KAREPORT_EXPORT qsizetype clusterEnd(QStringView line, qsizetype begin);
+qsizetype clusterEnd(QStringView line, qsizetype begin);
 
 } // namespace kareport

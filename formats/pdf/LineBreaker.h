@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QStringView>
 
 #include <functional>
@@ -17,7 +15,6 @@ using CharacterWidth = std::function<int(char32_t)>;
 /// middle of a word only where the word alone is wider than the box. Blanks at the end of the line take no room.
 /// @param width  of the box, in thousandths of the font size
 /// @param pieces  receives the pieces, at least one; together they are the line
-KAREPORT_EXPORT void breakLine(QStringView line, double width, const CharacterWidth &characterWidth,
-                               std::vector<QStringView> &pieces);
+void breakLine(QStringView line, double width, const CharacterWidth &characterWidth, std::vector<QStringView> &pieces);
 
 } // namespace kareport

@@ -1,8 +1,7 @@
 #pragma once
 
-#include "KaReportExport.h"
-#include "PdfFaces.h"
 #include "PdfGeometry.h"
+#include "PdfNotes.h"
 
 #include <QLatin1StringView>
 #include <QStringList>
@@ -16,34 +15,6 @@ class QIODevice;
 
 namespace kareport
 {
-
-/// A character that no face of the system has.
-struct MissingCharacter
-{
-    char32_t character = 0;
-    qint64 count = 0;
-    qint64 firstLine = 0; ///< from 1
-};
-
-/// Lines that are too wide for a page.
-struct PdfWideLines
-{
-    qint64 count = 0;
-    qint64 firstLine = 0; ///< from 1
-    double points = 0;    ///< the type size that they led to
-};
-
-/// What there is to say about a PDF.
-struct KAREPORT_EXPORT PdfNotes
-{
-    PdfWideLines reduced;                  ///< lines that made the type of the whole PDF smaller
-    PdfWideLines broken;                   ///< lines that had to be broken all the same
-    std::vector<MissingCharacter> missing; ///< in the order in which they occur; U+FFFD or "?" stands in their places
-    QString problem;                       ///< one sentence, when the PDF could not be made
-
-    /// Sentences about wide lines and missing characters, for a person.
-    QStringList warnings() const;
-};
 
 /// What a PDF is made of besides its text.
 struct PdfOptions
@@ -62,9 +33,7 @@ struct PdfOptions
 /// characters are not shown.
 /// @param notes  receives what is missing or went wrong; may be null
 /// @return false when the page has not been measured, no face can be used, the library fails, or a write fails
-KAREPORT_EXPORT bool writePdf(QIODevice &device, QStringView text, const PdfOptions &options,
-                              PdfNotes *notes = nullptr);
-KAREPORT_EXPORT bool writePdf(QIODevice &device, QLatin1StringView text, const PdfOptions &options,
-                              PdfNotes *notes = nullptr);
+bool writePdf(QIODevice &device, QStringView text, const PdfOptions &options, PdfNotes *notes = nullptr);
+bool writePdf(QIODevice &device, QLatin1StringView text, const PdfOptions &options, PdfNotes *notes = nullptr);
 
 } // namespace kareport

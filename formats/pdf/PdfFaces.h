@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QString>
 #include <QStringList>
 
@@ -13,7 +11,7 @@ namespace kareport
 {
 
 /// A font file of the system that a PDF can embed.
-class KAREPORT_EXPORT PdfFace
+class PdfFace
 {
 public:
     struct Coverage;
@@ -36,18 +34,17 @@ private:
 };
 
 /// The folders that the system's fonts are in.
-KAREPORT_EXPORT QStringList systemFontFolders();
+QStringList systemFontFolders();
 
 /// The face that stands first, whatever a report holds, where the system has it: MSGOTHIC.TTC or else lucon.TTF.
-KAREPORT_EXPORT std::optional<PdfFace> preferredPdfFace(const QStringList &fontFolders);
+std::optional<PdfFace> preferredPdfFace(const QStringList &fontFolders);
 /// The fixed-pitch faces of the system in the order in which they are tried, collections with CJK last.
-KAREPORT_EXPORT std::vector<PdfFace> fixedPitchPdfFaces();
+std::vector<PdfFace> fixedPitchPdfFaces();
 
 /// The faces of a PDF: the one that its grid is made of comes first, each of the others shows what those before it lack.
 /// None where the system has no face at all.
 /// @param preferred  stands first whatever it covers
 /// @param others     in the order of preference; the first of them that has all of plain text stands first otherwise
-KAREPORT_EXPORT std::vector<PdfFace> orderPdfFaces(const std::optional<PdfFace> &preferred,
-                                                   const std::vector<PdfFace> &others);
+std::vector<PdfFace> orderPdfFaces(const std::optional<PdfFace> &preferred, const std::vector<PdfFace> &others);
 
 } // namespace kareport

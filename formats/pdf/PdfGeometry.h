@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QMargins>
 #include <QSize>
 
@@ -45,12 +43,11 @@ struct LinePlacement
     qsizetype lines = 0;     ///< that a sheet takes; the others go on the next one
 };
 
-KAREPORT_EXPORT PdfPageBox pdfPageBox(const PdfPageSetup &setup);
+PdfPageBox pdfPageBox(const PdfPageSetup &setup);
 
 /// The lines that a page has to have room for: those of a page or, where these would stand closer than the font is high,
 /// those of the whole report when they are fewer. A report that is not meant to have pages is given very long ones.
-KAREPORT_EXPORT qsizetype linesToFit(const PdfPageSetup &setup, const PdfPageBox &box, const FaceHeight &face,
-                                     qsizetype linesOfReport);
+qsizetype linesToFit(const PdfPageSetup &setup, const PdfPageBox &box, const FaceHeight &face, qsizetype linesOfReport);
 
 /// Places the lines of a page in its box: as far apart as the face is high or, where the lines that a page has to have
 /// room for do not fit then, as close as they have to be. Lines never run into each other: the font is made smaller where they
@@ -59,15 +56,15 @@ KAREPORT_EXPORT qsizetype linesToFit(const PdfPageSetup &setup, const PdfPageBox
 /// @param fontSize    points
 /// @param linesToFit  lines that every page has room for
 /// @param lines       lines that this page has
-KAREPORT_EXPORT LinePlacement placeLines(double fontSize, const PdfPageBox &box, const FaceHeight &face,
-                                         qsizetype linesToFit, qsizetype lines);
+LinePlacement placeLines(double fontSize, const PdfPageBox &box, const FaceHeight &face, qsizetype linesToFit,
+                         qsizetype lines);
 
 /// The cells that stand side by side in a box.
-KAREPORT_EXPORT qint64 cellsAcross(const PdfPageBox &box, int cell, double fontSize);
+qint64 cellsAcross(const PdfPageBox &box, int cell, double fontSize);
 
 /// The type size for rows of so many cells: the given one or, where they are wider than the box, the one that they fit it
 /// with, but not below `smallestType`.
 /// @param cell  the advance of a cell, in thousandths of the font size
-KAREPORT_EXPORT double sizeForCells(const PdfPageBox &box, int cell, double fontSize, qint64 cells);
+double sizeForCells(const PdfPageBox &box, int cell, double fontSize, qint64 cells);
 
 } // namespace kareport

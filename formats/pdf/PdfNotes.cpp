@@ -1,4 +1,5 @@
-#include "PdfExport.h"
+#include "PdfNotes.h"
+
 #include "Xlate.h"
 
 #include <algorithm>

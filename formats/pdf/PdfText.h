@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QLatin1StringView>
 #include <QString>
 #include <QStringView>
@@ -13,12 +11,12 @@ namespace kareport
 
 /// Turns a line of a report, without its line feed, into what is seen of it: tabs become blanks up to the next eighth
 /// cell, other control characters and blanks at the end go, and half a surrogate pair becomes U+FFFD.
-KAREPORT_EXPORT void visibleLine(QStringView line, QString &visible);
-KAREPORT_EXPORT void visibleLine(QLatin1StringView line, QString &visible);
+void visibleLine(QStringView line, QString &visible);
+void visibleLine(QLatin1StringView line, QString &visible);
 
 /// The characters of a text that are seen, each once, in the order of their codes.
-KAREPORT_EXPORT std::u32string visibleCharacters(QStringView text);
-KAREPORT_EXPORT std::u32string visibleCharacters(QLatin1StringView text);
+std::u32string visibleCharacters(QStringView text);
+std::u32string visibleCharacters(QLatin1StringView text);
 
 /// The lines of a text that are wider than their room.
 struct WideLines
@@ -30,7 +28,7 @@ struct WideLines
 
 /// @param characters  of the text, as `visibleCharacters` gives them
 /// @param room        in cells
-KAREPORT_EXPORT WideLines wideLines(QStringView text, const std::u32string &characters, qint64 room);
-KAREPORT_EXPORT WideLines wideLines(QLatin1StringView text, const std::u32string &characters, qint64 room);
+WideLines wideLines(QStringView text, const std::u32string &characters, qint64 room);
+WideLines wideLines(QLatin1StringView text, const std::u32string &characters, qint64 room);
 
 } // namespace kareport

@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QByteArray>
 #include <QLatin1StringView>
 
@@ -13,7 +11,7 @@ namespace kareport
 /// Reads a text file in lines as `UReportDoc::LoadFile` takes them: one character a byte, whatever the bytes mean, CR LF as
 /// LF, and lines of more than 1022 characters in pieces. What reads a saved report back as the text that it was is
 /// `decodeReportText`.
-class KAREPORT_EXPORT ByteLineReader
+class ByteLineReader
 {
 public:
     static constexpr qsizetype longestPiece = 1022;

@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QString>
 #include <QStringView>
 
@@ -9,6 +7,6 @@ namespace kareport
 {
 
 /// A text whose lines end with CR LF: every LF that has no CR before it gets one. In one pass, however many lines there are.
-KAREPORT_EXPORT QString withCrLf(QStringView text);
+QString withCrLf(QStringView text);
 
 } // namespace kareport

@@ -1,15 +1,10 @@
 #include "ReportTextCodec.h"
 
-#include "MemoryLasts.h"
-
 #include <QChar>
-#include <QIODevice>
 
-#include <algorithm>
 #include <array>
 #include <cstdint>
 #include <cstring>
-#include <utility>
 
 namespace kareport
 {
@@ -149,61 +144,6 @@ std::size_t ReportTextEncoder::encodeCharacters(const Character *at, const Chara
         }
     }
     return static_cast<std::size_t>(out - begin);
-}
-
-namespace
-{
-constexpr qsizetype pieceSize = 64 * 1024;
-}
-
-bool ReportTextWriter::writeBytes(const char *bytes, std::size_t size)
-{
-    if (!std::exchange(hasFailed_, true)) { // also where the device throws: nobody knows how much of it was taken
-        hasFailed_ = device_.write(bytes, static_cast<qint64>(size)) != static_cast<qint64>(size);
-    }
-    return !hasFailed_;
-}
-
-template <typename Text>
-bool ReportTextWriter::writePieces(Text text, bool last)
-{
-    if (!hasBegun_) {
-        hasBegun_ = true;
-        // What cannot be turned into bytes is as good as not written.
-        hasFailed_ = !doneWhileMemoryLasts([this] { bytes_.resize(ReportTextEncoder::bound(pieceSize)); });
-        if (lineEnds_ == LineEnds::ReportFile) {
-            writeBytes(reportFileMark, sizeof reportFileMark);
-        }
-    }
-    isEmpty_ = isEmpty_ && text.isEmpty();
-    if (hasFailed_) {
-        return false;
-    }
-    qsizetype at = 0;
-    do {
-        const qsizetype count = std::min(pieceSize, text.size() - at);
-        const bool isLast = last && at + count == text.size();
-        if (!writeBytes(bytes_.data(), encoder_.encode(text.sliced(at, count), bytes_.data(), isLast))) {
-            return false;
-        }
-        at += count;
-    } while (at < text.size());
-    return true;
-}
-
-bool ReportTextWriter::write(QStringView text)
-{
-    return writePieces(text, false);
-}
-
-bool ReportTextWriter::write(QLatin1StringView text)
-{
-    return writePieces(text, false);
-}
-
-bool ReportTextWriter::finish()
-{
-    return writePieces(QStringView(), true);
 }
 
 bool writeReportText(QIODevice &device, QStringView text, LineEnds lineEnds)

@@ -1,28 +1,19 @@
 #pragma once
 
-#include "KaReportExport.h"
-#include "TextOutlet.h"
+#include "ReportTextWriter.h"
 
 #include <QLatin1StringView>
 #include <QStringView>
 
 #include <cstddef>
-#include <vector>
 
 class QIODevice;
 
 namespace kareport
 {
 
-/// How line feeds are written.
-enum class LineEnds
-{
-    ReportFile, ///< LF as CR LF; a line of a report, which ends with CR LF already, then ends with CR CR LF
-    PlainText   ///< CR LF as LF, every other character as it is
-};
-
 /// Turns report text into UTF-8, piece by piece and in the order of the text.
-class KAREPORT_EXPORT ReportTextEncoder
+class ReportTextEncoder
 {
 public:
     explicit ReportTextEncoder(LineEnds lineEnds) : lineEnds_(lineEnds) {}
@@ -47,39 +38,8 @@ private:
 /// The bytes that a report file begins with: the UTF-8 byte-order mark.
 inline constexpr char reportFileMark[] = {'\xEF', '\xBB', '\xBF'};
 
-/// Writes report text to an open device as it comes.
-class KAREPORT_EXPORT ReportTextWriter : public TextOutlet
-{
-public:
-    /// The device must live as long as the writer.
-    ReportTextWriter(QIODevice &device, LineEnds lineEnds) : device_(device), encoder_(lineEnds), lineEnds_(lineEnds) {}
-
-    /// Writes what comes next in the text. @return false once a write has failed; what comes then is passed over
-    bool write(QStringView text) override;
-    bool write(QLatin1StringView text) override;
-    /// Ends the text. @return whether all of it was written
-    bool finish();
-
-    bool hasFailed() const { return hasFailed_; }
-    /// Whether there was no text yet.
-    bool isEmpty() const { return isEmpty_; }
-
-private:
-    template <typename Text>
-    bool writePieces(Text text, bool last);
-    bool writeBytes(const char *bytes, std::size_t size);
-
-    QIODevice &device_;
-    ReportTextEncoder encoder_;
-    LineEnds lineEnds_;
-    std::vector<char> bytes_;
-    bool hasBegun_ = false;
-    bool isEmpty_ = true;
-    bool hasFailed_ = false;
-};
-
 /// Writes report text to an open device, a piece at a time. @return false as soon as a write fails
-KAREPORT_EXPORT bool writeReportText(QIODevice &device, QStringView text, LineEnds lineEnds);
-KAREPORT_EXPORT bool writeReportText(QIODevice &device, QLatin1StringView text, LineEnds lineEnds);
+bool writeReportText(QIODevice &device, QStringView text, LineEnds lineEnds);
+bool writeReportText(QIODevice &device, QLatin1StringView text, LineEnds lineEnds);
 
 } // namespace kareport

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
 #include "TextPlaces.h"
 
 #include <QByteArrayView>
@@ -16,6 +15,6 @@ namespace kareport
 /// get CR LF. (A report whose text has bare line feeds only comes back with CR LF.) `loadReportText` reads the same into a
 /// report, piece by piece; `ByteLineReader` reads any file without looking at its encoding.
 /// @return where the file is no UTF-8; nothing when all of it was read
-KAREPORT_EXPORT std::optional<TextPlace> decodeReportText(QByteArrayView bytes, QString &text);
+std::optional<TextPlace> decodeReportText(QByteArrayView bytes, QString &text);
 
 } // namespace kareport

@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QString>
 #include <QStringView>
 
@@ -14,7 +12,7 @@ namespace kareport
 ///
 /// Every piece of text stands in a paragraph template of its style; every line end is a paragraph mark. Text goes in as it
 /// is: backslashes and braces act as markup.
-class KAREPORT_EXPORT RichTextImage
+class RichTextImage
 {
 public:
     /// Whether what is written becomes rich text, or stays as it is for a spreadsheet.

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
 #include "TextPlaces.h"
 
 #include <QByteArrayView>
@@ -17,7 +16,7 @@ namespace kareport
 {
 
 /// What a rich text holds that is not shown.
-struct KAREPORT_EXPORT RichTextNotes
+struct RichTextNotes
 {
     int pictures = 0;
     int objects = 0;   ///< embedded or linked; the text that stands in for one is shown
@@ -38,13 +37,13 @@ struct RichTextError
 };
 
 /// Whether the bytes or the text begin as a rich text does: with "{\rtf".
-KAREPORT_EXPORT bool isRichText(QByteArrayView bytes);
-KAREPORT_EXPORT bool isRichText(QStringView text);
-KAREPORT_EXPORT bool isRichText(QLatin1StringView text);
+bool isRichText(QByteArrayView bytes);
+bool isRichText(QStringView text);
+bool isRichText(QLatin1StringView text);
 
 /// The rich text of a file, whatever it is called: it may begin with a byte-order mark or white space. Empty when it is
 /// none.
-KAREPORT_EXPORT QByteArrayView richTextIn(QByteArrayView bytes);
+QByteArrayView richTextIn(QByteArrayView bytes);
 
 /// Reads the bytes of a rich-text file (RTF) into a document, whose content is replaced. Bytes from 0x80 on are read in the
 /// code page of the current font, else of the file. What stands after the end of the outermost group is not read.
@@ -52,13 +51,12 @@ KAREPORT_EXPORT QByteArrayView richTextIn(QByteArrayView bytes);
 /// The signs of the fonts Symbol and Wingdings become the characters that Unicode has for them.
 /// The document keeps no undo steps of what is read.
 /// @return what is wrong, the document then holds what was read up to there; nothing where all was read
-KAREPORT_EXPORT std::optional<RichTextError> readRichText(QByteArrayView bytes, QTextDocument &document,
-                                                          RichTextNotes *notes = nullptr);
+std::optional<RichTextError> readRichText(QByteArrayView bytes, QTextDocument &document,
+                                          RichTextNotes *notes = nullptr);
 /// Reads the characters alone, as the document's `toRawText` has them: several times faster.
-KAREPORT_EXPORT std::optional<RichTextError> readRichTextCharacters(QByteArrayView bytes, QString &text,
-                                                                    RichTextNotes *notes = nullptr);
+std::optional<RichTextError> readRichTextCharacters(QByteArrayView bytes, QString &text,
+                                                    RichTextNotes *notes = nullptr);
 /// Reads into a document a rich text in memory, in which characters from U+0080 on stand for themselves.
-KAREPORT_EXPORT std::optional<RichTextError> readRichText(QStringView text, QTextDocument &document,
-                                                          RichTextNotes *notes = nullptr);
+std::optional<RichTextError> readRichText(QStringView text, QTextDocument &document, RichTextNotes *notes = nullptr);
 
 } // namespace kareport

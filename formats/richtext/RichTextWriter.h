@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 class QIODevice;
 class QTextDocument;
 
@@ -12,6 +10,6 @@ namespace kareport
 /// Tables are written as paragraphs, their cells with tabs between; pictures are left out. The same document gives the
 /// same bytes.
 /// @return false as soon as a write fails
-KAREPORT_EXPORT bool writeRichText(QIODevice &device, const QTextDocument &document);
+bool writeRichText(QIODevice &device, const QTextDocument &document);
 
 } // namespace kareport

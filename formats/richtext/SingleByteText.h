@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QStringView>
 
 class QIODevice;
@@ -18,6 +16,6 @@ enum class WideCharacters
 
 /// Writes a text to an open device with one byte a character up to U+00FF, and each LF as CR LF.
 /// @return false as soon as a write fails
-KAREPORT_EXPORT bool writeSingleByteText(QIODevice &device, QStringView text, WideCharacters wide);
+bool writeSingleByteText(QIODevice &device, QStringView text, WideCharacters wide);
 
 } // namespace kareport

@@ -29,14 +29,16 @@ enum class PaperSize
 /// The printer that the application prints on unless told otherwise.
 struct DefaultPrinter
 {
-    PrinterSource source = PrinterSource::SystemOrBuiltIn;
-    PaperSize paper = PaperSize::ByLocale; ///< of the built-in page device
-    int resolution = 600;                  ///< of the built-in page device, dots per inch
+    PrinterSource source = PrinterSource::SystemOrBuiltIn; ///< which printer it is
+    PaperSize paper = PaperSize::ByLocale;                 ///< of the built-in page device
+    int resolution = 600;                                  ///< of the built-in page device, dots per inch
     QString name = QString(); ///< of the installed printer that the user has selected; empty for the system's
     QSize sheet = QSize();    ///< of the installed printer, upright, in points; empty for the printer's own
 };
 
+/// The printer that pages are measured on and printed by; the system's, or the built-in page device, until it is set.
 KAREPORT_EXPORT const DefaultPrinter &defaultPrinter();
+/// Sets that printer. Reports that are there keep the page that they were measured with.
 KAREPORT_EXPORT void setDefaultPrinter(const DefaultPrinter &printer);
 
 } // namespace kareport

@@ -27,6 +27,7 @@ struct EditorLaunch
 KAREPORT_EXPORT void launchEditor(const QString &program, const QString &file, const QString &folder,
                                   UDocument *document = nullptr);
 
+/// Starts a program with a file.
 using EditorLauncher = std::function<void(const EditorLaunch &launch)>;
 
 /// Installs what starts programs in place of a process of their own; an empty one takes it away again.

@@ -20,8 +20,9 @@ KAREPORT_EXPORT void SetLastOpenDir(const QString &path, const QString &key);
 namespace kareport
 {
 
-/// An empty path goes back to the folder that holds without a setting.
+/// Sets what `GetLibraryDir` gives; an empty path goes back to the folder of the installed templates.
 KAREPORT_EXPORT void setLibraryDir(const QString &path);
+/// Sets what `GetStartPathName` gives; an empty path goes back to the folder that the program was started in.
 KAREPORT_EXPORT void setStartPathName(const QString &path);
 
 } // namespace kareport

@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QString>
 
 namespace kareport
@@ -12,12 +10,12 @@ namespace kareport
 /// protected_symlinks, which many systems have switched off.
 /// @param folderMode  permissions and kind of the folder that the link stands in
 /// @param user        who follows it
-KAREPORT_EXPORT bool mayFollowLink(unsigned folderMode, unsigned folderOwner, unsigned linkOwner, unsigned user);
+bool mayFollowLink(unsigned folderMode, unsigned folderOwner, unsigned linkOwner, unsigned user);
 
 /// The file that a name stands for, with every link on the way followed. The file itself need not exist. A name that leads
 /// nowhere is its own target: what is wrong with it shows when it is opened.
 /// @param error  receives a sentence when a link on the way may not be followed; may be null
 /// @return empty when a link may not be followed
-KAREPORT_EXPORT QString linkTarget(const QString &path, QString *error = nullptr);
+QString linkTarget(const QString &path, QString *error = nullptr);
 
 } // namespace kareport

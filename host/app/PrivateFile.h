@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QFile>
 #include <QString>
 
@@ -13,13 +11,13 @@ namespace kareport
 
 /// Opens a new file for writing that only the user can read. What has the name already is never opened, followed or
 /// replaced. @return false when there is something of that name, or no file can be made
-KAREPORT_EXPORT bool openPrivateFile(QFile &file);
+bool openPrivateFile(QFile &file);
 
 /// Puts an empty file that only the user can read into the place of a file or a link; what a link points to stays.
 /// @return false when something of that name cannot be removed, or no file can be made
-KAREPORT_EXPORT bool makePrivateFile(const QString &path);
+bool makePrivateFile(const QString &path);
 
 /// Whether there is anything of that name, be it a link that leads nowhere.
-KAREPORT_EXPORT bool isNameTaken(const QString &path);
+bool isNameTaken(const QString &path);
 
 } // namespace kareport

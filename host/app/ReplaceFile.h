@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QIODevice>
 #include <QString>
 
@@ -15,7 +13,6 @@ namespace kareport
 /// @param write  writes the content; false, or a failed write, leaves the target alone
 /// @param error  receives the system's reason when the answer is false; may be null
 /// @return whether the target now holds the content
-KAREPORT_EXPORT bool replaceFile(const QString &path, const std::function<bool(QIODevice &)> &write,
-                                 QString *error = nullptr);
+bool replaceFile(const QString &path, const std::function<bool(QIODevice &)> &write, QString *error = nullptr);
 
 } // namespace kareport

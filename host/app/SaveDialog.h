@@ -24,7 +24,7 @@ struct SaveRequest
     QString initialFolder;    ///< empty for the host's own choice
     /// Pairs of a kind's title and its name pattern, each behind a "|", ended by "||".
     QString filter;
-    unsigned flags = 0;
+    unsigned flags = 0;            ///< of those above
     UDocument *document = nullptr; ///< that is to be saved; may be null
 };
 

@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QString>
 
 namespace kareport
@@ -12,6 +10,6 @@ inline constexpr unsigned allFilesTitle = 61442;
 inline constexpr unsigned fileTooLarge = 61701;
 
 /// A standard text by its number, in the current language; empty for a number that is not known.
-KAREPORT_EXPORT QString standardText(unsigned number);
+QString standardText(unsigned number);
 
 } // namespace kareport

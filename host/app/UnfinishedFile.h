@@ -1,13 +1,11 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 namespace kareport
 {
 
 /// Remembers the name of a file that stands beside its target while it is written, so that a program that is ended by a
 /// signal can take it away. A file without a name, as most file systems have, vanishes by itself.
-class KAREPORT_EXPORT UnfinishedFile
+class UnfinishedFile
 {
 public:
     /// @param handle  of the open file

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
 #include "UDataObject.h"
 
 #include <QStringView>
@@ -14,14 +13,13 @@ namespace kareport
 /// The order of two values; null stands for a missing entry. A missing one comes first, then numbers by their value,
 /// then texts by their case-folded characters, then point numbers in natural order. Not-a-number comes before all other
 /// numbers, so that the order stays one.
-KAREPORT_EXPORT std::weak_ordering compareEntries(const UDictEntry *left, const UDictEntry *right);
+std::weak_ordering compareEntries(const UDictEntry *left, const UDictEntry *right);
 
 /// Compares two objects by the values under the identifiers in turn.
-KAREPORT_EXPORT std::weak_ordering compareObjects(const UDataObject &left, const UDataObject &right,
-                                                  const std::vector<unsigned> &ids);
+std::weak_ordering compareObjects(const UDataObject &left, const UDataObject &right, const std::vector<unsigned> &ids);
 
 /// Natural order: runs of ASCII digits compare by number, other runs case-folded, so 9 comes before 10 and 12 before
 /// 12A.
-KAREPORT_EXPORT std::weak_ordering compareNaturally(QStringView left, QStringView right);
+std::weak_ordering compareNaturally(QStringView left, QStringView right);
 
 } // namespace kareport

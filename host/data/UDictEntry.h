@@ -13,8 +13,10 @@
 class UDictEntry
 {
 public:
+    /// The kinds of values, in the order of their numbers.
     using Value = std::variant<bool, qint16, qint32, double, QString, UPointNumber>;
 
+    /// A value under an identifier.
     UDictEntry(unsigned id, Value value) : id_(id), value_(std::move(value)) {}
 
     /// The identifier under which a dictionary holds the entry.
@@ -29,7 +31,9 @@ public:
         return std::visit([](const auto &held) -> const void * { return &held; }, value_);
     }
 
+    /// The value with its kind.
     const Value &value() const { return value_; }
+    /// The value, to be changed in place; it may become one of another kind.
     Value &value() { return value_; }
 
 private:

@@ -24,7 +24,9 @@ public:
         }
         return value.emplace<T>();
     }
+    /// Takes the value under an identifier away; nothing when there is none.
     void Remove(unsigned id);
+    /// Takes all values away.
     void Clear() { entries_.clear(); }
 
 private:

@@ -32,8 +32,10 @@ public:
     /// Docks the pane in the main frame, or lets it stand alone where there is none.
     void SetPlace(CViewPane *parent, unsigned style, const QRect *rect) override;
     void UpdateTitle() override;
+    /// Whether the pane is open, be it as a tab that another stands before.
     bool IsVisible() const override;
     bool IsInFront() const override;
+    /// Shows the pane and brings it to the front, or hides it.
     void ShowPane(bool show) override;
     /// Raises the pane, which becomes the active one of its frame and gets the keyboard; nothing while it is hidden.
     void BringToTop() override;
@@ -43,7 +45,9 @@ public:
 
     /// Whether the pane may stand among the documents as one of their tabs.
     virtual bool CanBeTabbedDocument() const { return true; }
+    /// Marks the caption or takes the mark away.
     void SetCaptionState(CaptionState state);
+    /// What `SetCaptionState` was given last; plain without a dock widget.
     CaptionState GetCaptionState() const;
 
     /// The pane's dock widget; null once it has gone with the frame that it stood in.

@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QHash>
 
 #include <optional>
@@ -9,10 +7,12 @@
 class UView;
 
 /// Remembers which tab of the frame's bar was in front while a view was used.
-class KAREPORT_EXPORT CRibbonBar
+class CRibbonBar
 {
 public:
+    /// Remembers the tab of a view, in the place of an earlier one. @param index  from 0
     void SetRibbonTabIndexForView(const UView *view, int index) { tabs_.insert(view, index); }
+    /// Forgets the tab of a view; nothing for a view that has none.
     void RemoveRibbonTabIndexForView(const UView *view) { tabs_.remove(view); }
     /// Nothing for a view that has none.
     std::optional<int> GetRibbonTabIndexForView(const UView *view) const

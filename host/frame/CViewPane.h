@@ -29,12 +29,15 @@ public:
 
     /// Takes a view into the pane, which owns it from then on.
     virtual void AddView(std::unique_ptr<UView> view);
+    /// The views, in the order in which they were added.
     const std::vector<std::unique_ptr<UView>> &GetViews() const { return views_; }
     /// Takes a view out of the pane and destroys it.
     void RemoveView(UView *view);
     /// Where the pane is to stand: window style and rectangle (null for the usual one). Called once, before it is shown.
     virtual void SetPlace(CViewPane *parent, unsigned style, const QRect *rect);
+    /// The window style that `SetPlace` was given; 0 before.
     unsigned GetStyle() const { return style_; }
+    /// The rectangle that `SetPlace` was given; nothing for the usual place.
     const std::optional<QRect> &GetRect() const { return rect_; }
     /// The view that was put into the pane last, which it shows; null for a pane without one.
     UView *GetActiveView() const { return views_.empty() ? nullptr : views_.back().get(); }
@@ -48,6 +51,7 @@ public:
 
     /// The pane's title without its number.
     virtual void SetWindowTextW(const QString &text);
+    /// The title as it was set, without a number.
     const QString &GetWindowTextW() const { return text_; }
     /// What stands on the pane's caption: its title, with ":" and its number when it has one.
     QString GetCaption() const;
@@ -57,11 +61,14 @@ public:
     /// The number of the pane among those that show the same document: from 1, 0 for an only pane and for one that is
     /// hidden, −1 while panes are being counted.
     int GetWindowNumber() const { return windowNumber_; }
+    /// Gives the pane its number, which `UDocument::UpdateFrameCounts` does; it shows with the next `UpdateTitle`.
     void SetWindowNumber(int number) { windowNumber_ = number; }
 
+    /// Whether the pane is open: shown, and not hidden since.
     virtual bool IsVisible() const { return visible_; }
     /// Whether the user sees the pane: it is visible, and no tab of another stands before it.
     virtual bool IsInFront() const { return IsVisible(); }
+    /// Shows the pane, or hides it with all that is in it.
     virtual void ShowPane(bool show);
     /// Brings the pane's window to the front.
     virtual void BringToTop();

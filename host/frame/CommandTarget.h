@@ -11,14 +11,14 @@ namespace kareport
 /// What an update handler says about its command, shown on every menu entry and button of it.
 struct CommandState
 {
-    bool enabled = true;
-    bool checked = false;
+    bool enabled = true;  ///< can be chosen
+    bool checked = false; ///< shows a mark
 };
 
 /// A command that a class handles.
 struct Command
 {
-    unsigned id = 0;
+    unsigned id = 0;                                 ///< its number
     std::function<void()> handler;                   ///< may be empty: then the command is only updated here
     std::function<void(CommandState &state)> update; ///< may be empty: the command is then always enabled
 };

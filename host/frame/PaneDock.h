@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QDockWidget>
 
 class COneViewPane;
@@ -11,7 +9,7 @@ namespace kareport
 
 /// The dock widget of a pane: its close box asks the pane, its caption can be marked, and where the pane must not become a
 /// tab it leaves every row of tabs that it gets into.
-class KAREPORT_EXPORT PaneDock : public QDockWidget
+class PaneDock : public QDockWidget
 {
 public:
     explicit PaneDock(COneViewPane *pane);

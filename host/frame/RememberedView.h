@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <memory>
 
 class UView;
@@ -10,7 +8,7 @@ namespace kareport
 {
 
 /// A view that is to get its place back after something else came to the front. It may go meanwhile.
-class KAREPORT_EXPORT RememberedView
+class RememberedView
 {
 public:
     /// @param view  null for none

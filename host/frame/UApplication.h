@@ -35,18 +35,23 @@ public:
 
     /// Puts a file to the front of the list of files last used.
     virtual void AddToRecentFileList(const QString &path);
+    /// The files last used, the last one first; at most ten.
     const QStringList &GetRecentFileList() const { return recentFiles_; }
 
     /// Called after a document has been made, opened, saved or closed.
     virtual void OnDocumentEvent(UDocument &document, UDocument::DocumentEvent event);
 
-    /// The report that the user works with, and the view that goes with it; null without one.
+    /// The report that the user works with; null for none.
     UDocument *GetCurrentReport() const { return currentReport_; }
+    /// The view that goes with the current report; null for none.
     UView *GetCompanionView() const { return companionView_; }
+    /// Notes the report that the user works with; null for none.
     void SetCurrentReport(UDocument *report) { currentReport_ = report; }
+    /// Notes the view that goes with the current report; null for none.
     void SetCompanionView(UView *view) { companionView_ = view; }
-    /// Takes a document, or a view, that goes out of the pair.
+    /// Takes a document that goes out of the pair; nothing when it is another one.
     void ForgetReport(const UDocument *report);
+    /// Takes a view that goes out of the pair; nothing when it is another one.
     void ForgetView(const UView *view);
 
 private:

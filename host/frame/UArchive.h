@@ -10,6 +10,7 @@
 class KAREPORT_EXPORT UArchive
 {
 public:
+    /// What is done with the file.
     enum class Mode
     {
         Storing,
@@ -19,7 +20,9 @@ public:
     /// The device must be open for the mode and live as long as the archive.
     UArchive(QIODevice &device, Mode mode, QString path);
 
+    /// Whether the document is stored.
     bool IsStoring() const { return mode_ == Mode::Storing; }
+    /// Whether the document is loaded.
     bool IsLoading() const { return mode_ == Mode::Loading; }
     /// The file's full path.
     const QString &GetFilePath() const { return path_; }
@@ -28,6 +31,7 @@ public:
 
     /// Writes bytes. A failed write is remembered: `IsGood` answers false from then on.
     void Write(QByteArrayView bytes);
+    /// Whether nothing has failed so far.
     bool IsGood() const { return good_; }
     /// Gives the storing or loading up: `IsGood` answers false from then on.
     void Abandon() { good_ = false; }

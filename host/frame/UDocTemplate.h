@@ -17,8 +17,10 @@ class UView;
 class KAREPORT_EXPORT UDocTemplate
 {
 public:
+    /// Makes a document; null when it cannot be made.
     using DocumentFactory = std::function<std::unique_ptr<UDocument>()>;
     using PaneFactory = std::function<CViewPane *()>; ///< a pane owns itself until it is closed
+    /// Makes a view; null when it cannot be made.
     using ViewFactory = std::function<std::unique_ptr<UView>()>;
 
     /// @param resourceId   identifies the texts, menus and icons of the kind
@@ -31,8 +33,11 @@ public:
     UDocTemplate(const UDocTemplate &) = delete;
     UDocTemplate &operator=(const UDocTemplate &) = delete;
 
+    /// The number that identifies the texts, menus and icons of the kind.
     unsigned GetResourceId() const { return resourceId_; }
+    /// Whether the template has a name; case counts.
     bool IsThatCreator(const QString &name) const { return creatorName_ == name; }
+    /// The documents of this template, in the order in which they were made.
     const std::vector<UDocument *> &GetDocuments() const { return documents_; }
 
     /// Makes a document, new when the path is empty, else loaded from the file, and a pane that shows it.

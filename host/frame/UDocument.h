@@ -19,6 +19,7 @@ class UView;
 class KAREPORT_EXPORT UDocument
 {
 public:
+    /// What has happened to a document.
     enum class DocumentEvent
     {
         AfterNewDocument,
@@ -32,18 +33,23 @@ public:
     UDocument(const UDocument &) = delete;
     UDocument &operator=(const UDocument &) = delete;
 
+    /// The title; empty until it is set.
     const QString &GetTitle() const { return title_; }
     /// Sets the title and the text of every pane that shows the document.
     virtual void SetTitle(const QString &title);
+    /// The full path of the file that the document belongs to; empty for none.
     const QString &GetPathName() const { return path_; }
     /// Sets the file that the document belongs to; its name becomes the title.
     virtual void SetPathName(const QString &path, bool addToRecentFiles);
 
+    /// Whether something has changed since the document was made, loaded or saved.
     virtual bool IsModified() const { return modified_; }
+    /// Notes that something has changed, or that nothing has.
     virtual void SetModifiedFlag(bool modified = true) { modified_ = modified; }
 
     /// Views in the order in which they were added. The panes own them.
     const std::vector<UView *> &GetViews() const { return views_; }
+    /// Adds a view, which shows this document from then on. The view stays its pane's.
     void AddView(UView *view);
     /// Called by a view that goes. A document whose last view has gone closes, unless auto-delete is off.
     void RemoveView(UView *view);
@@ -59,6 +65,7 @@ public:
     virtual bool OnOpenDocument(const QString &path);
     /// Stores into a file through `Serialize`, in one step: a failed write leaves an earlier file as it was.
     virtual bool OnSaveDocument(const QString &path);
+    /// Stores the document into an archive, or loads it from one; a plain document has nothing to store.
     virtual void Serialize(UArchive &archive);
     /// Saves under a path and, with `replace`, makes it the document's own.
     virtual bool DoSave(const QString &path, bool replace);
@@ -74,6 +81,7 @@ public:
     virtual bool IsShown(const CViewPane *except = nullptr) const;
     /// Closes the panes and the document.
     virtual void OnCloseDocument();
+    /// Empties the document; a plain document has nothing to empty.
     virtual void DeleteContents();
     /// Called when a closed document is about to delete itself.
     virtual void OnAutoDelete();
@@ -82,7 +90,9 @@ public:
     /// Whether the document only serves a search of the shell's; no document of this host does.
     virtual bool IsSearchAndOrganizeHandler() const { return false; }
 
+    /// Whether the document deletes itself when it is closed, as it does at first.
     bool IsAutoDelete() const { return autoDelete_; }
+    /// Sets whether the document deletes itself when it is closed. Where it does not, whoever says so deletes it.
     void SetAutoDelete(bool on) { autoDelete_ = on; }
 
     /// Tells the document that a report it had asked for has been closed and is about to go.
@@ -91,6 +101,7 @@ public:
     /// @return false when the document has no such object (any more)
     virtual bool OnTextReceived(unsigned id, const QString &text);
 
+    /// The template that has made the document and owns it; null for one that was made otherwise.
     UDocTemplate *GetDocTemplate() const { return docTemplate_; }
 
 protected:

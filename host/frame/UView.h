@@ -23,6 +23,7 @@ public:
     /// The longest file in bytes that a view of text takes.
     static constexpr qint64 nMaxSize = 0x3FFFFFFF;
 
+    /// The document shown; null before `UDocument::AddView` and once the document has gone.
     UDocument *GetDocument() const { return document_; }
     /// The pane that shows the view; null for a view without one.
     CViewPane *GetParentPane() const { return pane_; }

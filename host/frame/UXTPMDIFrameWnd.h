@@ -31,12 +31,14 @@ class UView;
 class KAREPORT_EXPORT UXTPMDIFrameWnd : public QMainWindow, public kareport::CommandTarget
 {
 public:
+    /// Makes the frame, which `Get` answers from then on. It needs a `QApplication`.
     explicit UXTPMDIFrameWnd(QWidget *parent = nullptr);
     ~UXTPMDIFrameWnd() override;
 
     /// The frame, or null in a program without one.
     static UXTPMDIFrameWnd *Get();
 
+    /// Which tab was in front for each view.
     CRibbonBar &GetRibbonBar() { return ribbonBar_; }
 
     /// The view that commands go to; null without one.
@@ -67,6 +69,7 @@ public:
     const std::vector<kareport::Command> &commands() const override;
 
 protected:
+    /// Watches the layout of the docked panes.
     bool event(QEvent *event) override;
     /// Called when panes were shown, hidden, raised or closed: makes the one in front that was used last the active one,
     /// unless the active one is in front.

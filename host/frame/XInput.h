@@ -1,9 +1,7 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 /// An input operation that a view is in the middle of, such as drawing a line by its points.
-class KAREPORT_EXPORT XInput
+class XInput
 {
 public:
     /// Why an operation ends.

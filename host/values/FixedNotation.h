@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <array>
 #include <string>
 #include <string_view>
@@ -11,7 +9,7 @@ namespace kareport
 
 /// The fixed notation of a number, correctly rounded (halves to even on the exact binary value), as C's printf writes
 /// it with "%.*f" in the "C" locale, but without its sign.
-class KAREPORT_EXPORT FixedNotation
+class FixedNotation
 {
 public:
     /// `value` must be finite; its sign is not looked at. `decimals` below 0 counts as 0.

@@ -8,3 +8,8 @@
 #else
 #define KAREPORT_EXPORT Q_DECL_IMPORT
 #endif
+
+/// All that is not known by a name with U or C in front, or by a function's name with a capital.
+namespace kareport
+{
+}

@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QStringView>
 
 namespace kareport
@@ -9,6 +7,6 @@ namespace kareport
 
 /// The decimal integer at the front of a text, after white space and one sign; 0 when there is none. A number outside
 /// 32 bits becomes the nearest that fits.
-KAREPORT_EXPORT qint32 leadingInteger(QStringView text);
+qint32 leadingInteger(QStringView text);
 
 } // namespace kareport

@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QString>
 #include <QStringView>
 
@@ -10,9 +8,9 @@ namespace kareport
 
 /// Whether two texts are the same without regard to case, character by character (simple Unicode folding: "ß" is not
 /// "ss"). All names are compared so.
-KAREPORT_EXPORT bool equalFolded(QStringView left, QStringView right);
+bool equalFolded(QStringView left, QStringView right);
 
 /// The text under which names that `equalFolded` takes for the same are found in a hash.
-KAREPORT_EXPORT QString foldedKey(QStringView text);
+QString foldedKey(QStringView text);
 
 } // namespace kareport

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "KaReportExport.h"
+#include "TextPlace.h"
 
 #include <QStringView>
 
@@ -9,15 +9,8 @@
 namespace kareport
 {
 
-/// A place in a text, both counted from 1.
-struct TextPlace
-{
-    qsizetype line = 1;
-    qsizetype column = 1; ///< in characters: a surrogate pair is one
-};
-
 /// Finds the places of positions in a text whose lines end with LF. The text must live as long as this object.
-class KAREPORT_EXPORT TextPlaces
+class TextPlaces
 {
 public:
     explicit TextPlaces(QStringView text);

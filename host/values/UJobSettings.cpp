@@ -1,6 +1,7 @@
 #include "UJobSettings.h"
 
 #include "FixedNotation.h"
+#include "UnitFactors.h"
 #include "VariableType.h"
 
 #include <algorithm>

@@ -2,7 +2,7 @@
 
 #include "KaReportExport.h"
 #include "TextBuffer.h"
-#include "UnitFactors.h"
+#include "Units.h"
 
 #include <QString>
 

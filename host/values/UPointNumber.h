@@ -8,6 +8,7 @@ class UPointNumber
 {
 public:
     UPointNumber() = default;
+    /// A number as it is shown.
     explicit UPointNumber(QString text) : text_(std::move(text)) {}
 
     /// The number as it is shown.

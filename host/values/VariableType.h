@@ -1,11 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
-#include <QStringView>
-
-#include <optional>
-
 /// The value type codes of dictionary variables. Codes 12 to 15 and 21 have no keyword.
 enum VARIABLE_TYPE
 {
@@ -29,13 +23,3 @@ enum VARIABLE_TYPE
     VARIABLE_PLAIN = 21,
     VARIABLE_THICKNESS = 22
 };
-
-namespace kareport
-{
-
-/// The type of a keyword such as "COORDINATE", in any case; nothing for any other text.
-KAREPORT_EXPORT std::optional<VARIABLE_TYPE> variableTypeFromKeyword(QStringView keyword);
-/// The keyword of a type, in capitals; empty where there is none.
-KAREPORT_EXPORT QStringView keywordOf(int type);
-
-} // namespace kareport

@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 namespace kareport
 {
 
@@ -11,6 +9,6 @@ namespace kareport
 /// marked as in use. On some processors every calculation with floating-point numbers then pays about 20 ns to go around
 /// them: five times what formatting a coordinate takes. Where many values are to be read or formatted, this stands before
 /// each row of them. It takes less than a nanosecond, and does nothing where there are no such registers.
-KAREPORT_EXPORT void endWideVectors();
+void endWideVectors();
 
 } // namespace kareport

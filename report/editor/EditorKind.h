@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QStringView>
 
 namespace kareport
@@ -16,13 +14,13 @@ enum class EditorKind
 
 /// The name of an editor's program without folders and without what follows its last ".". Folders end with "/" or "\" on
 /// every platform: a user's preferences may come from another one.
-KAREPORT_EXPORT QStringView editorStem(QStringView path);
+QStringView editorStem(QStringView path);
 
 /// Whether the program is the spreadsheet that can stand in for a word processor.
-KAREPORT_EXPORT bool isExcelEditor(QStringView path);
+bool isExcelEditor(QStringView path);
 
 /// The kind of an editor by the name of its program, in any case. @param excelOption  whether the report may go to the
 /// spreadsheet as to a word processor
-KAREPORT_EXPORT EditorKind editorKind(QStringView path, bool excelOption);
+EditorKind editorKind(QStringView path, bool excelOption);
 
 } // namespace kareport

@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QString>
 
 namespace kareport
@@ -9,9 +7,9 @@ namespace kareport
 
 /// The path of the user's editor as it is entered; empty while the user does not want one. Nothing is kept: the user may
 /// change the preferences, or install the editor, at any time.
-KAREPORT_EXPORT QString preferredEditor();
+QString preferredEditor();
 
 /// The path of the user's editor; empty when it is not wanted or not installed.
-KAREPORT_EXPORT QString availableEditor();
+QString availableEditor();
 
 } // namespace kareport

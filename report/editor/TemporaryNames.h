@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QHashFunctions>
 #include <QString>
 
@@ -12,10 +10,10 @@ namespace kareport
 
 /// The stem of the temporary files of a report: its own name where it has no extension, what an extension has beyond three
 /// letters where it is longer, else "Report$$$".
-KAREPORT_EXPORT QString temporaryStem(const QString &reportFileName);
+QString temporaryStem(const QString &reportFileName);
 
 /// Names for temporary report files. Each is handed out once; what the file system holds is not looked at.
-class KAREPORT_EXPORT TemporaryNames
+class TemporaryNames
 {
 public:
     /// The first name in a folder that has not been handed out: the stem, then the stem with a number from 2 on. When

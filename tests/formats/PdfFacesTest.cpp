@@ -1,3 +1,4 @@
+#include "PdfFaces.h"
 #include "PdfFixture.h"
 
 #include <gtest/gtest.h>

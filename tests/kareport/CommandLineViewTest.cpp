@@ -1,7 +1,5 @@
 #include "CommandLine.h"
 
-#include <QDirIterator>
-#include <QFileInfo>
 #include <QTest>
 
 #include <gtest/gtest.h>
@@ -51,14 +49,6 @@ TEST(CommandLineView, WhatCannotBeShownIsSaid)
     }
 }
 
-/// Where a program finds its libraries that does not stand beside them.
-QString folderOfLibraries()
-{
-    QDirIterator found(QFileInfo(QStringLiteral(KAREPORT_PROGRAM)).dir().filePath(QStringLiteral("../lib")),
-                       {QStringLiteral("libKaReport.so.0")}, QDir::Files, QDirIterator::Subdirectories);
-    return found.hasNext() ? QFileInfo(found.next()).absolutePath() : QString();
-}
-
 TEST(CommandLineView, TheDesktopProgramIsStartedWithTheFile)
 {
     // A copy of the program stands alone, so that it finds the other one on the path.
@@ -74,7 +64,6 @@ TEST(CommandLineView, TheDesktopProgramIsStartedWithTheFile)
         environment.insert(QStringLiteral("PATH"), folder.path() + u':' + environment.value(QStringLiteral("PATH")));
         environment.insert(QStringLiteral("NOTE"), note);
         environment.insert(QStringLiteral("DISPLAY"), QStringLiteral(":9"));
-        environment.insert(QStringLiteral("LD_LIBRARY_PATH"), folderOfLibraries());
         process.setProcessEnvironment(environment);
         process.setWorkingDirectory(folder.path());
         process.start(bin.path("kareport"), {QStringLiteral("view"), QStringLiteral("--"), QString::fromUtf8(name)});

@@ -1,10 +1,9 @@
-#include <ReportEntry.h>
-#include <ReportInitialTemplate.h>
-#include <UApplication.h>
-#include <UReportDoc.h>
-
-#include <DefaultPrinter.h>
-#include <Profile.h>
+#include <KaReport/DefaultPrinter.h>
+#include <KaReport/Profile.h>
+#include <KaReport/ReportEntry.h>
+#include <KaReport/ReportInitialTemplate.h>
+#include <KaReport/UApplication.h>
+#include <KaReport/UReportDoc.h>
 
 #include <QApplication>
 

@@ -1,4 +1,5 @@
 #include "PageSetupDialog.h"
+#include "PrintQuestions.h"
 
 #include "PrintDialogs.h"
 #include "PrintQt.h"

@@ -1,5 +1,5 @@
 #include "LandXmlFile.h"
-#include "VariableType.h"
+#include "VariableKeywords.h"
 
 #include <QRegularExpression>
 #include <gtest/gtest.h>

@@ -1,5 +1,7 @@
 #include "PdfFixture.h"
 
+#include "PdfFaces.h"
+
 QString dejaVuFile()
 {
     return QStringLiteral("/usr/share/fonts/truetype/dejavu/DejaVuSansMono.ttf");

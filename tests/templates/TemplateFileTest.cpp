@@ -1,5 +1,7 @@
 #include "TemplateFile.h"
+
 #include "PrintQt.h"
+#include "ScanText.h"
 
 #include <QDir>
 #include <QFile>

@@ -1,4 +1,4 @@
-#include "VariableType.h"
+#include "VariableKeywords.h"
 
 #include "TextFolding.h"
 

@@ -1,0 +1,43 @@
+# Tests of what is installed: as a program outside of the project sees it.
+set(prefix ${CMAKE_CURRENT_BINARY_DIR}/package/prefix)
+set(prefix_libraries ${prefix}/${CMAKE_INSTALL_LIBDIR}/$<TARGET_FILE_NAME:KaReportHost>
+                     ${prefix}/${CMAKE_INSTALL_LIBDIR}/$<TARGET_FILE_NAME:KaReport>)
+set(outside ${CMAKE_CURRENT_BINARY_DIR}/package/build)
+
+# Into an empty folder: what is not installed any more is not there.
+add_test(NAME package.clear COMMAND ${CMAKE_COMMAND} -E rm -rf ${prefix} ${outside})
+add_test(NAME package.install COMMAND ${CMAKE_COMMAND} --install ${CMAKE_BINARY_DIR} --prefix ${prefix})
+set_tests_properties(package.clear PROPERTIES FIXTURES_SETUP package)
+set_tests_properties(package.install PROPERTIES FIXTURES_SETUP package DEPENDS package.clear)
+
+add_test(NAME package.binaries COMMAND ${check_binaries} ${prefix}/bin/kareport ${prefix}/bin/kareport-desk ${prefix_libraries})
+add_test(NAME package.exports COMMAND ${PROJECT_SOURCE_DIR}/scripts/check-exports.py
+                                      ${prefix}/${CMAKE_INSTALL_INCLUDEDIR}/KaReport ${prefix_libraries})
+add_test(NAME package.exports.check COMMAND ${CMAKE_CURRENT_SOURCE_DIR}/check-exports-test.sh ${CMAKE_CXX_COMPILER})
+
+add_test(NAME package.use COMMAND ${CMAKE_CTEST_COMMAND}
+         --build-and-test ${CMAKE_CURRENT_SOURCE_DIR}/package ${outside}
+         --build-generator ${CMAKE_GENERATOR}
+         --build-options -DCMAKE_PREFIX_PATH=${prefix} -DCMAKE_BUILD_TYPE=Debug -DHOST_TEMPLATES=${PROJECT_SOURCE_DIR}/examples
+         --test-command ${outside}/consumer)
+set_tests_properties(package.use PROPERTIES FIXTURES_SETUP package.built)
+add_test(NAME package.own-host COMMAND ${outside}/own-host-program ${CMAKE_CURRENT_BINARY_DIR}/package)
+add_test(NAME package.standalone COMMAND ${outside}/standalone)
+add_test(NAME package.headers COMMAND ${CMAKE_COMMAND} --build ${outside} --target headers)
+set_tests_properties(package.own-host package.standalone package.headers PROPERTIES FIXTURES_REQUIRED package.built)
+set_tests_properties(package.headers PROPERTIES LABELS heavy TIMEOUT 900)
+add_test(NAME package.pkg-config COMMAND ${CMAKE_CURRENT_SOURCE_DIR}/package/pkg-config-test.sh ${CMAKE_CXX_COMPILER}
+         ${prefix}/${CMAKE_INSTALL_LIBDIR} ${outside} ${PROJECT_VERSION})
+# The example host is built and run in the same way, as its guide says.
+add_test(NAME package.example COMMAND ${CMAKE_CTEST_COMMAND}
+         --build-and-test ${PROJECT_SOURCE_DIR}/examples/host ${CMAKE_CURRENT_BINARY_DIR}/package/example
+         --build-generator ${CMAKE_GENERATOR}
+         --build-options -DCMAKE_PREFIX_PATH=${prefix} -DCMAKE_BUILD_TYPE=Debug
+         --test-command ${CMAKE_CURRENT_BINARY_DIR}/package/example/host ${CMAKE_CURRENT_BINARY_DIR}/package)
+add_test(NAME package.example.plain COMMAND ${CMAKE_CURRENT_BINARY_DIR}/package/example/plain --once)
+set_tests_properties(package.example PROPERTIES FIXTURES_SETUP package.examples)
+set_tests_properties(package.example.plain PROPERTIES FIXTURES_REQUIRED package.examples TIMEOUT 60
+                                                      ENVIRONMENT QT_QPA_PLATFORM=offscreen)
+set_tests_properties(package.binaries package.exports package.use package.pkg-config package.example
+                     PROPERTIES FIXTURES_REQUIRED package)
+add_test(NAME package.api COMMAND ${PROJECT_SOURCE_DIR}/scripts/api-docs.sh ${CMAKE_CURRENT_BINARY_DIR}/package/api)
