@@ -29,4 +29,9 @@ report 'A progress dialog shows what it does in a label of its own that is plain
     "$(grep -lE '\bQProgressDialog [a-z]|new QProgressDialog' $sources | xargs -r grep -L 'setLabel(plainLabel' || true)"
 report 'Every header guards itself:' \
     "$(for header in $(printf '%s\n' $sources | grep '\.h$'); do head -n 1 "$header" | grep -q '#pragma once' || echo "$header"; done)"
+report 'Every header that a host includes stands in its guide (those of the records together):' \
+    "$(scripts/public-headers.sh | while read -r header; do
+        name=$(basename "$header")
+        grep -q "\`$name\`" docs/guide-host.md || [ "${name#sXml}" != "$name" ] || echo "$header"
+    done)"
 exit $failed

@@ -33,12 +33,15 @@ packages_test=(
     fonts-wqy-zenhei        # a face with CJK
     qt6-translations-l10n   # Qt's own texts in other languages
     parallel                # spreads a batch of jobs over processes and machines
+    doxygen                 # says which member of a public header has no sentence
+    pkg-config              # a program outside that asks it for our flags
 )
 packages_docs=(
     doxygen                 # the pages of the public headers
 )
 packages_package=(
     dpkg-dev file           # Debian packages and what they depend on
+    python3                 # the check of what the libraries offer
 )
 packages_office=(
     libreoffice-writer-nogui # rich text read by somebody else; the tests use it where it is installed

@@ -1,27 +1,31 @@
 // A small host: makes a report of its own lines and one through a template, and saves both into a folder. With --window it
 // does so in a window, and makes one more report that is shown while it is written; without, it needs no display.
-#include <AppMessageBox.h>
-#include <DefaultPrinter.h>
-#include <Folders.h>
-#include <Language.h>
-#include <PlainWidgets.h>
-#include <Profile.h>
-#include <ReportEntry.h>
-#include <ReportInitialTemplate.h>
-#include <ReportMenu.h>
-#include <ReportWindowEntry.h>
-#include <SaveDialog.h>
-#include <UApplication.h>
-#include <UDataObjectList.h>
-#include <UJobSettings.h>
-#include <UPointNumber.h>
-#include <UReportDoc.h>
-#include <UXTPMDIFrameWnd.h>
+#include <KaReport/AppMessageBox.h>
+#include <KaReport/COneViewPane.h>
+#include <KaReport/DefaultPrinter.h>
+#include <KaReport/Folders.h>
+#include <KaReport/Language.h>
+#include <KaReport/PlainWidgets.h>
+#include <KaReport/Profile.h>
+#include <KaReport/ReportEntry.h>
+#include <KaReport/ReportInitialTemplate.h>
+#include <KaReport/ReportMenu.h>
+#include <KaReport/ReportWindowEntry.h>
+#include <KaReport/SaveDialog.h>
+#include <KaReport/UApplication.h>
+#include <KaReport/UDataObjectList.h>
+#include <KaReport/UJobSettings.h>
+#include <KaReport/UPointNumber.h>
+#include <KaReport/UReportDoc.h>
+#include <KaReport/UView.h>
+#include <KaReport/UXTPMDIFrameWnd.h>
 
 #include <QApplication>
 #include <QCloseEvent>
 #include <QFileDialog>
 #include <QMenuBar>
+#include <QPlainTextEdit>
+#include <QPointer>
 
 #include <cstdio>
 
@@ -90,6 +94,32 @@ bool save(UReportDoc *report, const QString &path)
     return isSaved;
 }
 
+/// A view of the program's own.
+class NotesView : public UView
+{
+public:
+    ~NotesView() override
+    {
+        if (edit_ != nullptr) {
+            edit_->deleteLater(); // it may be in the middle of the key that closes its pane
+        }
+    }
+    QWidget *GetWidget() override { return edit_; }
+
+private:
+    QPointer<QPlainTextEdit> edit_ = new QPlainTextEdit; // goes with a frame that goes first
+};
+
+COneViewPane *showNotes()
+{
+    auto *pane = new COneViewPane;
+    pane->SetPlace(nullptr, 0, nullptr); // docks it, as a tab beside the reports
+    pane->AddView(std::make_unique<NotesView>());
+    pane->SetWindowTextW(QStringLiteral("Notes"));
+    pane->ShowPane(true);
+    return pane; // it owns itself until it is closed
+}
+
 class Frame : public UXTPMDIFrameWnd
 {
 public:
@@ -105,6 +135,13 @@ public:
         });
         resize(1000, 700);
         show();
+        notes_ = showNotes();
+    }
+    ~Frame() override
+    {
+        if (CViewPane::IsOpen(notes_)) { // not if the user has closed it
+            notes_->ClosePane();
+        }
     }
 
 protected:
@@ -121,6 +158,9 @@ protected:
             kareport::noteExitCancelled();
         }
     }
+
+private:
+    COneViewPane *notes_;
 };
 
 int main(int argc, char **argv)

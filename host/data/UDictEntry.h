@@ -24,6 +24,7 @@ public:
     /// What `GetData` points to: 1 a boolean byte, 2 a 16-bit integer, 4 a 32-bit integer, 8 a double, 16 a `QString`,
     /// 32 a `UPointNumber`.
     int GetKind() const { return static_cast<int>(kind()); }
+    /// The same as the kind that it is.
     kareport::ValueKind kind() const { return static_cast<kareport::ValueKind>(1 << value_.index()); }
     /// The value itself; valid as long as the entry is not changed.
     const void *GetData() const
