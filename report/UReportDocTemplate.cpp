@@ -30,7 +30,11 @@ bool UReportDoc::LoadTemplateXml(const QString &fileName, const QString &templat
 bool UReportDoc::LoadTemplateFile(const QString &path, const QString &templateName, const QString &tableName,
                                   const QString &blockName)
 {
-    return kareport::whileMemoryLasts(false, [&] { return loadTemplate({path}, templateName, tableName, blockName); });
+    return kareport::whileMemoryLasts(false, [&] {
+        QStringList paths; // not made of its member in braces, which does not survive when memory ends
+        paths.append(path);
+        return loadTemplate(paths, templateName, tableName, blockName);
+    });
 }
 
 bool UReportDoc::loadTemplate(const QStringList &paths, const QString &templateName, const QString &tableName,

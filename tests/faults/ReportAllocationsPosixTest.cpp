@@ -183,6 +183,11 @@ constexpr Operation operations[] = {
          return s.report.LoadTemplateXml(QStringLiteral("t.xml"), QStringLiteral("T"), QStringLiteral("Points"),
                                          QStringLiteral("Site"));
      }},
+    {"LoadTemplateFile", Text::Same,
+     [](auto &s, auto &around) {
+         return s.report.LoadTemplateFile(around.templatePath, QStringLiteral("T"), QStringLiteral("Points"),
+                                          QStringLiteral("Site"));
+     }},
     {"LoadTemplateTable",
      Text::Same,
      [](auto &s, auto &) { return s.report.LoadTemplateTable(QStringLiteral("Points")); },

@@ -36,6 +36,7 @@ public:
     RecordedLaunches launches;
     const PreferredEditor editor;
     const AnsweredBoxes boxes{MessageAnswer::No};
+    const QString templatePath = folders_.libraryPath() + QStringLiteral("/t.xml");
     const QString loadPath = folder_.at(QStringLiteral("a.rep"));
     const QString reportPath = folder_.at(QStringLiteral("s.rep"));
     const QString richTextPath = folder_.at(QStringLiteral("s.rtf"));
