@@ -2,7 +2,6 @@
 #include "PrintJob.h"
 #include "ProcessorTime.h"
 
-#include <QApplication>
 #include <QPainter>
 #include <QPlainTextDocumentLayout>
 #include <QPrinter>
@@ -15,15 +14,6 @@
 
 namespace
 {
-
-void needWindows()
-{
-    static int count = 1;
-    static char name[] = "ka_bench";
-    static char *arguments[] = {name, nullptr};
-    qputenv("QT_QPA_PLATFORM", "offscreen");
-    static QApplication application(count, arguments);
-}
 
 /// Rows of a point list, 80 characters long, 72 to a page.
 QString pointRows(qint64 pages)
@@ -72,7 +62,6 @@ struct Printed
 /// Where the pages begin, as a preview or a job for some of the pages needs it.
 void countPrintPages(benchmark::State &state)
 {
-    needWindows();
     Printed printed(state.range(0));
     qint64 pages = 0;
     for (auto _ : state) {
@@ -89,7 +78,6 @@ BENCHMARK(countPrintPages)->Arg(100)->Arg(1000)->Arg(10'000)->Unit(benchmark::kM
 /// the open text.
 void printPages(benchmark::State &state)
 {
-    needWindows();
     Printed printed(state.range(0));
     const long before = peakMemory();
     int pages = 0;

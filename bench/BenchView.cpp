@@ -1,4 +1,3 @@
-#include "BenchApplication.h"
 #include "ReportEdit.h"
 #include "UReportDoc.h"
 #include "UReportView.h"
@@ -74,7 +73,6 @@ struct Report
 
 void showBare(benchmark::State &state)
 {
-    needApplication();
     const QString text = reportOfLines(state.range(0), u"\r\n");
     for (auto _ : state) {
         auto edit = std::make_unique<QPlainTextEdit>();
@@ -90,7 +88,6 @@ BENCHMARK(showBare)->Arg(30'000)->Arg(300'000)->Arg(1'000'000)->Unit(benchmark::
 
 void showReport(benchmark::State &state)
 {
-    needApplication();
     for (auto _ : state) {
         state.PauseTiming();
         Report report(reportOfLines(state.range(0), u"\r\n"));
@@ -106,7 +103,6 @@ BENCHMARK(showReport)->Arg(30'000)->Arg(300'000)->Arg(1'000'000)->Unit(benchmark
 
 void showRichText(benchmark::State &state)
 {
-    needApplication();
     for (auto _ : state) {
         Report report(richTextOfLines(state.range(0)));
         report.open();
@@ -144,7 +140,6 @@ void pressKeys(benchmark::State &state, QPlainTextEdit &edit)
 
 void keyInBare(benchmark::State &state)
 {
-    needApplication();
     QPlainTextEdit edit;
     edit.setLineWrapMode(QPlainTextEdit::NoWrap);
     edit.setPlainText(reportOfLines(state.range(0), u"\r\n"));
@@ -156,7 +151,6 @@ BENCHMARK(keyInBare)->Arg(30'000)->Arg(300'000)->Iterations(1000)->Unit(benchmar
 /// @param state  lines, views
 void keyInReport(benchmark::State &state)
 {
-    needApplication();
     Report report(reportOfLines(state.range(0), u"\r\n"));
     UReportView *view = report.open();
     for (qint64 i = 1; i < state.range(1); ++i) {

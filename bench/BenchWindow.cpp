@@ -1,4 +1,3 @@
-#include "BenchApplication.h"
 #include "ReportEntry.h"
 #include "ReportInitialTemplate.h"
 #include "ReportWindowEntry.h"
@@ -6,6 +5,7 @@
 #include "UReportDoc.h"
 #include "UXTPMDIFrameWnd.h"
 
+#include <QCoreApplication>
 #include <QElapsedTimer>
 
 #include <benchmark/benchmark.h>
@@ -40,7 +40,6 @@ double writeLines(UReportDoc &report, int count)
 
 void writeReport(benchmark::State &state, bool inWindow)
 {
-    needApplication();
     UApplication application;
     application.AddDocTemplate(ReportInitialTemplate());
     UXTPMDIFrameWnd frame;
