@@ -24,6 +24,8 @@ public:
     /// Loads the report's text where it was changed since and the view was not told, as a view that nobody sees is not.
     /// Nothing in a view that always shows what the report holds.
     virtual void loadIfStale() {}
+    /// Loads at once what a view that loads a long text in pieces does not show yet.
+    virtual void finishLoading() {}
     /// Writes what the view shows to an open device, as rich text. @return false as soon as a write fails
     virtual bool streamRichText(QIODevice &device) const = 0;
     /// The same as plain text of one byte a character. @return false as soon as a write fails

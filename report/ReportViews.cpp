@@ -1,6 +1,7 @@
 #include "ReportViews.h"
 
 #include "CViewPane.h"
+#include "MemoryLasts.h"
 #include "ReportEntry.h"
 #include "UView.h"
 
@@ -20,6 +21,15 @@ std::vector<UView *> reportViews(const UReportDoc &report)
     std::vector<UView *> views;
     std::copy_if(report.GetViews().begin(), report.GetViews().end(), std::back_inserter(views), showsReport);
     return views;
+}
+
+void finishLoading(const UReportDoc &report)
+{
+    doneWhileMemoryLasts([&report] {
+        for (UView *view : reportViews(report)) {
+            dynamic_cast<ReportViewPort *>(view)->finishLoading();
+        }
+    });
 }
 
 void openOwnPane(UReportDoc &report)

@@ -91,6 +91,7 @@ bool saveByName(UReportDoc &report, const QString &path, QString &problem)
         problem = Xlate("a part of the report was lost when memory ran out");
         return false;
     }
+    kareport::finishLoading(report);
     if (isRichTextName(path)) {
         // Without a view that can write it, the report text is saved under the name.
         const auto saved = saveViewAsRichText(report, path, problem);

@@ -157,6 +157,13 @@ void UReportView::OnSaveReportText()
     }
 }
 
+void UReportView::finishLoading()
+{
+    if (widget_) {
+        edit_->finishLoading();
+    }
+}
+
 bool UReportView::streamRichText(QIODevice &device) const
 {
     if (widget_) {

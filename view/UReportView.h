@@ -96,6 +96,7 @@ public:
     bool streamRichText(QIODevice &device) const override;
     bool streamPlainText(QIODevice &device) const override;
     void loadIfStale() override;
+    void finishLoading() override;
     const std::vector<kareport::Command> &commands() const override;
 
     // Printing

@@ -7,6 +7,7 @@
 #include "PdfExport.h"
 #include "ReplaceFile.h"
 #include "ReportSaveName.h"
+#include "ReportViews.h"
 #include "SavedText.h"
 #include "UApplication.h"
 #include "UReportDoc.h"
@@ -95,6 +96,7 @@ void exportPdf(const UReportDoc &report, const QString &path)
         problem = Xlate("the report is empty, and a PDF has one page at least");
     } else {
         const WaitCursor cursor;
+        finishLoading(report);
         isWritten = replaceFile(
             path, [&report, &notes](QIODevice &device) { return report.WritePdf(device, &notes); }, &problem);
     }

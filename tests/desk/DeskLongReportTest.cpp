@@ -4,9 +4,13 @@
 #include "Recovery.h"
 #include "ReportCommandIds.h"
 #include "ReportEdit.h"
+#include "ReportWindowEntry.h"
+#include "SaveAs.h"
+#include "SaveDialog.h"
 #include "SavedReports.h"
 #include "TextFile.h"
 #include "UReportView.h"
+#include "UReportWindowDlg.h"
 #include "WorkAside.h"
 
 #include <QTemporaryDir>
@@ -79,17 +83,79 @@ TEST(DeskLongReport, IsWholeForWhateverNeedsItWhileItIsShownInPieces)
     const QByteArray content = longFile();
     folder.put("a.rep", content);
     Desk desk;
+    for (const char *name : {"b.rep", "b.rtf", "b.pdf"}) {
+        ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.rep")));
+        UReportDoc &report = *Desk::reports().front();
+        ASSERT_TRUE(editOf(report).isLoading());
+        QTest::keyClicks(&editOf(report), QStringLiteral("x"));
+        EXPECT_FALSE(report.IsModified()) << "nothing can be typed yet";
+        EXPECT_TRUE(report.OnSaveDocument(folder.path(name)));
+        EXPECT_FALSE(editOf(report).isLoading()) << name << ": who saves a report sees what is saved";
+        EXPECT_TRUE(editOf(report).windowText() == report.CopyText()) << name;
+        report.OnCloseDocument();
+    }
+    EXPECT_TRUE(folder.bytesOf("b.rep") == content);
+    EXPECT_GT(folder.bytesOf("b.rtf").size(), content.size());
+    EXPECT_TRUE(folder.bytesOf("b.pdf").startsWith("%PDF-"));
+}
+
+TEST(DeskLongReport, IsWholeWhenItIsExported)
+{
+    const JobFolder folder;
+    folder.put("a.rep", longFile(60'000));
+    Desk desk;
     ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.rep")));
     UReportDoc &report = *Desk::reports().front();
     ASSERT_TRUE(editOf(report).isLoading());
-    EXPECT_TRUE(report.OnSaveDocument(folder.path("b.rep")));
-    EXPECT_TRUE(folder.bytesOf("b.rep") == content);
-    QTest::keyClicks(&editOf(report), QStringLiteral("x"));
-    EXPECT_FALSE(report.IsModified()) << "nothing can be typed yet";
-    EXPECT_TRUE(editOf(report).isLoading()) << "saving the text needs no view";
-    EXPECT_TRUE(report.OnSaveDocument(folder.path("b.rtf")));
-    EXPECT_FALSE(editOf(report).isLoading()) << "rich text is that of the view";
-    EXPECT_GT(folder.bytesOf("b.rtf").size(), content.size());
+    kareport::setSaveDialog([&folder](const kareport::SaveRequest &request) {
+        return kareport::askOwnName(request, [&](const kareport::SaveRequest &) { return folder.path("b.pdf"); });
+    });
+    report.DoSave(QString(), true);
+    kareport::setSaveDialog({});
+    EXPECT_TRUE(folder.bytesOf("b.pdf").startsWith("%PDF-"));
+    EXPECT_FALSE(editOf(report).isLoading());
+    EXPECT_TRUE(editOf(report).windowText() == report.CopyText());
+}
+
+/// Ticks from the event loop as often as it can.
+class Ticks
+{
+public:
+    explicit Ticks(const UReportDoc &report)
+    {
+        QObject::connect(&timer_, &QTimer::timeout, &timer_,
+                         [this, &report] { whileLoading += editOf(report).isLoading() ? 1 : 0; });
+        timer_.start(0);
+    }
+
+    int whileLoading = 0; ///< of them while the report's view was not whole
+
+private:
+    QTimer timer_;
+};
+
+TEST(DeskLongReport, ThatWasMadeOpensInItsViewWhileTheWindowsAnswer)
+{
+    constexpr int lines = 100'000;
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    UReportDoc *report = CreateReportWindow(QStringLiteral("R"), false, false);
+    ASSERT_NE(report, nullptr);
+    for (int line = 0; line < lines; ++line) {
+        report->WriteLine(QStringLiteral("line %1 of a report that was just made").arg(line), 0, 1, 0);
+    }
+    report->SetReportWindowActive();
+    auto *window = dynamic_cast<UReportWindowDlg *>(report->GetReportWindow());
+    ASSERT_NE(window, nullptr);
+    window->OnShowReport();
+    ASSERT_EQ(report->GetViews().size(), 1U);
+    EXPECT_TRUE(editOf(*report).isLoading()) << "the window shows its beginning";
+    EXPECT_TRUE(editOf(*report).isReadOnly());
+    EXPECT_LT(editOf(*report).document()->blockCount(), lines / 2);
+    const Ticks ticks(*report);
+    ASSERT_TRUE(isShownWhole(*report));
+    EXPECT_GE(ticks.whileLoading, 3) << "what else waits for the event loop has its turn between the pieces";
+    EXPECT_TRUE(editOf(*report).windowText() == report->CopyText());
 }
 
 TEST(DeskLongReport, ThatIsBeingReadIsNotOpenedTwice)

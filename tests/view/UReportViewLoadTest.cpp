@@ -1,12 +1,17 @@
 #include "ViewFixture.h"
 
 #include "FindBar.h"
+#include "UApplication.h"
 
 #include <QClipboard>
 #include <QElapsedTimer>
 #include <QLabel>
 #include <QLineEdit>
 #include <QScrollBar>
+#include <QTemporaryDir>
+
+#include <memory>
+#include <utility>
 
 namespace
 {
@@ -132,6 +137,17 @@ TEST(UReportViewLoad, IsFinishedByWhatNeedsTheWholeText)
          },
          "printing"},
         {[](LongReport &report) {
+             const QTemporaryDir folder;
+             EXPECT_TRUE(report.shown.report.OnSaveDocument(folder.filePath(QStringLiteral("a.rep"))));
+         },
+         "saving as a report file"},
+        {[](LongReport &report) {
+             const QTemporaryDir folder;
+             report.shown.report.SetPageSize();
+             EXPECT_TRUE(report.shown.report.OnSaveDocument(folder.filePath(QStringLiteral("a.pdf"))));
+         },
+         "saving as a PDF"},
+        {[](LongReport &report) {
              widgetOf(*report.view).openFindBar();
              QTest::keyClicks(&widgetOf(*report.view).findBar().field(), QStringLiteral("59999"));
          },
@@ -149,6 +165,41 @@ TEST(UReportViewLoad, IsFinishedByWhatNeedsTheWholeText)
         EXPECT_TRUE(report.isWhole()) << row.reason;
         EXPECT_EQ(report.shown.report.GetTextLength(), longText().size()) << row.reason;
     }
+}
+
+/// Keeps the text that it is sent.
+class Receiver : public UDocument
+{
+public:
+    explicit Receiver(QString &received) : received_(received) {}
+    bool OnTextReceived(unsigned /*id*/, const QString &text) override
+    {
+        received_ = text;
+        return true;
+    }
+
+private:
+    QString &received_;
+};
+
+TEST(UReportViewLoad, TheTextThatGoesBackToItsObjectIsWhole)
+{
+    QString received;
+    UApplication application;
+    UDocTemplate *receivers = application.AddDocTemplate(std::make_unique<UDocTemplate>(
+        9, [&received] { return std::make_unique<Receiver>(received); }, UDocTemplate::PaneFactory(),
+        UDocTemplate::ViewFactory(), QStringLiteral("Receivers"), 0, 0));
+    UDocument *receiver = receivers->OpenReportDocumentFile(QString(), 0, 0, nullptr, 0, nullptr);
+    LongReport report;
+    ASSERT_TRUE(report.edit().isLoading());
+    report.shown.report.SetTextObject(receiver, 7);
+    report.shown.report.SaveText();
+    EXPECT_TRUE(report.isWhole());
+    // Two bytes of the view are one character there.
+    EXPECT_GT(received.size(), longText().size() / 2 - 100'000);
+    const QString whole = std::exchange(received, QString());
+    report.shown.report.SaveText();
+    EXPECT_TRUE(received == whole) << "as it is sent when all of it is shown";
 }
 
 TEST(UReportViewLoad, BeginsAnewWhenTheTextIsAnother)
