@@ -53,7 +53,9 @@ ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, 
         }
         const OutputResult result = writeOutput(report, output, progress);
         if (result.isReaderGone) {
+            progress.finish();
             endByClosedReader();
+            return exitOutput; // whoever has switched the signal off wants no more of it either
         }
         progress.finish();
         if (!result.isWritten() && isInterrupted()) {
