@@ -62,7 +62,8 @@ bool replaceFile(const QString &path, const std::function<bool(QIODevice &)> &wr
     if (!reason.isEmpty()) {
         return finish(false, error, reason);
     }
-    return finish(file.commit(), error, file.errorString());
+    const bool isDone = file.commit(); // before its reason is asked for: arguments are evaluated in any order
+    return finish(isDone, error, file.errorString());
 }
 
 } // namespace kareport

@@ -18,12 +18,14 @@ namespace
 thread_local constinit qint64 left = 0;
 thread_local constinit std::size_t least = 0;
 thread_local constinit bool isRefused = false;
+thread_local constinit bool refusesAllAfter = false;
 
 bool refuses(std::size_t bytes)
 {
     if (left == 0 || bytes < least || --left > 0) {
         return false;
     }
+    left = refusesAllAfter ? 1 : 0;
     isRefused = true;
     errno = ENOMEM;
     return true;
@@ -62,9 +64,10 @@ __attribute__((visibility("default"))) int posix_memalign(void **memory, std::si
 }
 // NOLINTEND(bugprone-reserved-identifier)
 
-FailingAllocation::FailingAllocation(qint64 number, std::size_t leastBytes)
+FailingAllocation::FailingAllocation(qint64 number, std::size_t leastBytes, Extent extent)
 {
     least = leastBytes;
+    refusesAllAfter = extent == Extent::AllAfter;
     isRefused = false;
     left = number;
 }

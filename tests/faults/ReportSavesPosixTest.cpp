@@ -4,6 +4,8 @@
 #include "FrameFixture.h"
 #include "JobOutputs.h"
 #include "JobRunnerFixture.h"
+#include "ReplaceFile.h"
+#include "ReportTextCodec.h"
 #include "ViewFixture.h"
 
 #include <QDir>
@@ -157,6 +159,20 @@ TEST(ReportSaves, AFullDiskIsSaidInTheSystemsWords)
         EXPECT_TRUE(result.problem.value_or(QString()).contains(QStringLiteral("No space left on device")))
             << static_cast<int>(kind) << ": " << result.problem.value_or(QString()).toStdString();
     }
+}
+
+TEST(ReportSaves, AFileThatCannotTakeItsPlaceIsSaidInTheSystemsWords)
+{
+    const QTemporaryDir folder;
+    const ShownReport shown(longText());
+    QString problem;
+    const FailingFiles failing(Call::Rename, 1);
+    EXPECT_FALSE(kareport::replaceFile(
+        folder.filePath(QStringLiteral("a.rep")),
+        [&shown](QIODevice &device) { return shown.report.WriteText(device, kareport::LineEnds::ReportFile); },
+        &problem));
+    EXPECT_TRUE(failing.hasFailed());
+    EXPECT_TRUE(problem.contains(QStringLiteral("Permission denied"))) << problem.toStdString();
 }
 
 TEST(ReportSaves, AJobThatGoesStraightToItsFileIsWholeOrNotWritten)
