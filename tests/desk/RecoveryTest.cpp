@@ -1,5 +1,6 @@
 #include "DeskFixture.h"
 
+#include "CrashFolder.h"
 #include "FrameFixture.h"
 #include "Recovery.h"
 #include "ReportEdit.h"
@@ -8,7 +9,6 @@
 #include "UReportView.h"
 
 #include <QDir>
-#include <QProcess>
 #include <QTemporaryDir>
 
 #include <gtest/gtest.h>
@@ -18,47 +18,6 @@ namespace
 
 using kareport::KeptReport;
 using kareport::Recovery;
-
-/// A folder as programs leave it that crash: what one of them kept, without the program.
-class CrashFolder
-{
-public:
-    QString path() const { return folder_.filePath(QStringLiteral("recovery")); }
-    /// The folders of programs in it.
-    QStringList programs() const { return QDir(path()).entryList(QDir::Dirs | QDir::NoDotAndDotDot); }
-    QStringList files(const QString &program) const
-    {
-        return QDir(path() + u'/' + program).entryList(QDir::Files, QDir::Name);
-    }
-    /// Ends a program as a crash does: its files stay, its lock is that of nobody.
-    void crash(std::unique_ptr<Recovery> recovery) const
-    {
-        const QString program = programs().value(0);
-        const QString kept = folder_.filePath(QStringLiteral("kept"));
-        QDir().mkpath(kept);
-        for (const QString &file : files(program)) {
-            QFile::copy(path() + u'/' + program + u'/' + file, kept + u'/' + file);
-        }
-        recovery.reset();
-        QDir().rename(kept, path() + QStringLiteral("/crashed"));
-        // The lock of a process that is no longer there.
-        putFile(path() + QStringLiteral("/crashed/lock"),
-                QByteArray::number(deadProcess()) + "\nka_tests\n" + QSysInfo::machineHostName().toUtf8() + "\n");
-    }
-
-private:
-    static qint64 deadProcess()
-    {
-        QProcess process;
-        process.start(QStringLiteral("true"), QStringList());
-        process.waitForStarted();
-        const qint64 id = process.processId();
-        process.waitForFinished();
-        return id;
-    }
-
-    QTemporaryDir folder_;
-};
 
 UReportDoc *makeReport(const QString &title, const QString &text, bool isModified = true)
 {
