@@ -50,6 +50,7 @@ TEST(UReportDocTitle, TheFirstFreeNumberFrom2IsTaken)
         QString title;
         QString expected;
         const char *reason;
+        int number = 0; ///< of the first pane among those of its document, the next one counting on; 0 for none
     };
     const QString n = QStringLiteral("N");
     const QString n2 = QStringLiteral("N 2");
@@ -70,6 +71,11 @@ TEST(UReportDocTitle, TheFirstFreeNumberFrom2IsTaken)
          QString::fromUtf8("\xC3\xBC"),
          QString::fromUtf8("\xC3\xBC 2"),
          "case does not matter beyond ASCII"},
+        {{n}, n, n, "the only pane left of several shows its number: it is another caption", 2},
+        {{n, n}, n, n, "likewise of two panes that stand there", 1},
+        {{n2, n2}, n2, n2, "or of a document that has a number already", 1},
+        {{n}, QStringLiteral("N:1"), QStringLiteral("N:1 2"), "a caption with its number counts as it is shown", 1},
+        {{n, n}, QStringLiteral("n:2"), QStringLiteral("n:2 2"), "of the second pane as well", 1},
     };
     for (const Row &row : rows) {
         const FixedSurroundings surroundings;
@@ -77,6 +83,7 @@ TEST(UReportDocTitle, TheFirstFreeNumberFrom2IsTaken)
         for (const QString &caption : row.captions) {
             panes.push_back(std::make_unique<CViewPane>());
             panes.back()->SetWindowTextW(caption);
+            panes.back()->SetWindowNumber(row.number > 0 ? row.number + static_cast<int>(panes.size()) - 1 : 0);
         }
         UReportDoc report;
         report.SetTitle(row.title);
@@ -105,6 +112,25 @@ TEST(UReportDocTitle, AReportsOwnPanesDoNotCount)
     EXPECT_EQ(report->GetTitle(), QStringLiteral("N 2")) << "another document's pane";
     report->SetTitle(QStringLiteral("N"));
     EXPECT_EQ(report->GetTitle(), QStringLiteral("N 2")) << "and the same again";
+}
+
+TEST(UReportDocTitle, AReportThatStandsInNumberedPanesLeavesItsTitleToOthers)
+{
+    const FixedSurroundings surroundings;
+    ReportApplication application;
+    UReportDoc *first = application.create(QStringLiteral("Traverse"));
+    first->Activate(true);
+    ASSERT_EQ(first->GetViews().size(), 2U);
+    for (const UView *view : first->GetViews()) {
+        view->GetParentPane()->ShowPane(true);
+    }
+    ASSERT_EQ(first->GetFrameWindow()->GetCaption(), QStringLiteral("Traverse:1"));
+    const UReportDoc *second = application.create(QStringLiteral("Traverse"));
+    EXPECT_EQ(second->GetTitle(), QStringLiteral("Traverse")) << "no pane shows that";
+    EXPECT_EQ(application.create(QStringLiteral("Traverse"))->GetTitle(), QStringLiteral("Traverse 2"));
+    first->GetViews().back()->GetParentPane()->ClosePane();
+    ASSERT_EQ(first->GetFrameWindow()->GetCaption(), QStringLiteral("Traverse"));
+    EXPECT_EQ(application.create(QStringLiteral("Traverse 2"))->GetTitle(), QStringLiteral("Traverse 2 2"));
 }
 
 TEST(UReportDocTitle, AnEmptyTitleIsNeverNumbered)
