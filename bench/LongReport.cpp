@@ -1,7 +1,9 @@
 // A long report opened at the desk, or a text in a bare control in pieces of 10,000 lines: from the call to all of it
 // shown, the longest time in which the window did not answer, and the processor time of the work that took longest.
 //
-//   ka_long_report FILE [--bare]
+//   ka_long_report FILE              the report file FILE is opened
+//   ka_long_report FILE --bare       the text FILE in the bare control
+//   ka_long_report FILE --view-edit  a report that was made of the lines of FILE is opened by View\Edit Report
 #include "DeskApplication.h"
 #include "DeskDialogs.h"
 #include "DeskFrame.h"
@@ -9,8 +11,10 @@
 #include "Profile.h"
 #include "ReportEdit.h"
 #include "ReportEntry.h"
+#include "ReportWindowEntry.h"
 #include "UReportDoc.h"
 #include "UReportView.h"
+#include "UReportWindowDlg.h"
 
 #include <QApplication>
 #include <QElapsedTimer>
@@ -82,6 +86,26 @@ void openBare(const QByteArray &bytes, QPlainTextEdit &edit)
     }
 }
 
+/// A report of the lines of a text, as a job makes it: the report window shows them.
+UReportWindowDlg *makeInWindow(const QByteArray &text)
+{
+    UReportDoc *report = CreateReportWindow(QStringLiteral("Report"), false, false);
+    for (const QByteArray &line : text.split('\n')) {
+        report->WriteLine(QString::fromUtf8(line), 0, 1, 0);
+    }
+    report->SetReportWindowActive();
+    return dynamic_cast<UReportWindowDlg *>(report->GetReportWindow());
+}
+
+/// Waits until the report that was opened last is shown as a whole. @return its lines
+int linesOfShownReport()
+{
+    const auto *report = dynamic_cast<UReportDoc *>(GetReportTemplate()->GetDocuments().back());
+    const auto *view = dynamic_cast<UReportView *>(report->GetViews().front());
+    waitUntil([view] { return !view->GetEdit().isLoading(); });
+    return view->GetEdit().document()->blockCount();
+}
+
 } // namespace
 
 int main(int argc, char **argv)
@@ -91,12 +115,13 @@ int main(int argc, char **argv)
     kareport::setProfileStore(kareport::makeMemoryProfile());
     const QStringList arguments = QApplication::arguments();
     if (arguments.size() < 2) {
-        std::fprintf(stderr, "ka_long_report FILE [--bare]\n");
+        std::fprintf(stderr, "ka_long_report FILE [--bare | --view-edit]\n");
         return 1;
     }
     const bool isBare = arguments.value(2) == QStringLiteral("--bare");
+    const bool isEdited = arguments.value(2) == QStringLiteral("--view-edit");
     QFile file(arguments[1]);
-    if (isBare && !file.open(QIODevice::ReadOnly)) {
+    if ((isBare || isEdited) && !file.open(QIODevice::ReadOnly)) {
         return 1;
     }
     DeskApplication desk;
@@ -109,6 +134,7 @@ int main(int argc, char **argv)
     if (!isBare) {
         frame.show();
     }
+    UReportWindowDlg *window = isEdited ? makeInWindow(file.readAll()) : nullptr;
     QCoreApplication::processEvents();
     Pulse pulse;
     QElapsedTimer time;
@@ -118,13 +144,12 @@ int main(int argc, char **argv)
         openBare(file.readAll(), edit);
         lines = edit.document()->blockCount();
     } else {
-        if (!frame.OpenFile(arguments[1])) {
+        if (window != nullptr) {
+            window->OnShowReport();
+        } else if (!frame.OpenFile(arguments[1])) {
             return 1;
         }
-        const auto *report = dynamic_cast<UReportDoc *>(GetReportTemplate()->GetDocuments().back());
-        auto *view = dynamic_cast<UReportView *>(report->GetViews().front());
-        waitUntil([view] { return !view->GetEdit().isLoading(); });
-        lines = view->GetEdit().document()->blockCount();
+        lines = linesOfShownReport();
     }
     QCoreApplication::processEvents();
     pulse.beat();
