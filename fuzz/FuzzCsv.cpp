@@ -9,8 +9,16 @@
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t *data, std::size_t size)
 {
     const std::string_view bytes(reinterpret_cast<const char *>(data), size);
-    const char delimiter = size > 0 && data[0] == ';' ? ';' : ',';
-    kareport::CsvReader reader(QStringLiteral("fuzz.csv"), bytes, delimiter);
+    const char first = size > 0 ? static_cast<char>(data[0]) : ',';
+    kareport::CsvReader::Layout layout;
+    layout.delimiter = first == ';' ? ';' : ',';
+    layout.whitespace = first == ' ';
+    if (first == '#') {
+        layout.comment = '#';
+        layout.passesBlankLines = true;
+        layout.skip = 1;
+    }
+    kareport::CsvReader reader(QStringLiteral("fuzz.csv"), bytes, layout);
     kareport::DataUnits sexagesimal;
     sexagesimal.sexagesimal = true;
     UDataObject object;

@@ -14,6 +14,9 @@ packages_build=(
     libcli11-dev            # the command line
     libhpdf-dev             # PDF
     libexpat1-dev           # LandXML files
+    nlohmann-json3-dev      # JSON files, object by object
+    libpq-dev               # PostgreSQL databases
+    libsqlite3-dev          # SQLite databases and GeoPackages
     libfontconfig-dev       # where the faces of a PDF are
     libfreetype-dev         # what the glyphs of a PDF are put together from
     fonts-dejavu-core       # the fixed-pitch face that a page is measured with, and of a PDF
@@ -29,6 +32,7 @@ packages_test=(
     qpdf                    # PDFs checked
     cups-daemon cups-client # a print queue
     cups-filters cups-filters-core-drivers cups-core-drivers # what a queue makes of a job
+    postgresql              # a database server
     fonts-liberation2       # a second fixed-pitch face
     fonts-wqy-zenhei        # a face with CJK
     qt6-translations-l10n   # Qt's own texts in other languages

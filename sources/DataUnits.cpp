@@ -30,4 +30,21 @@ double DataUnits::factorOf(int type) const
     }
 }
 
+QString DataUnits::assumedKey(int type) const
+{
+    switch (type) {
+    case VARIABLE_COORDINATE:
+    case VARIABLE_LENGTH:
+    case VARIABLE_DISTANCE:
+    case VARIABLE_ELEVATION:
+    case VARIABLE_STATION:
+    case VARIABLE_OFFSET: return isLengthSaid ? QString() : keyOf(length).toString();
+    case VARIABLE_AREA: return isAreaSaid ? QString() : keyOf(area).toString();
+    case VARIABLE_ANGLE:
+    case VARIABLE_VANGLE:
+    case VARIABLE_BEARING: return isAngleSaid ? QString() : keyOf(angle).toString();
+    default: return {};
+    }
+}
+
 } // namespace kareport

@@ -2,6 +2,7 @@
 
 #include "InputError.h"
 #include "MappedFile.h"
+#include "SpooledBytes.h"
 
 #include <QByteArray>
 #include <QFile>
@@ -14,7 +15,8 @@
 namespace kareport
 {
 
-/// The bytes of a file. A large one is mapped where the system can, so that it is never in memory as a whole.
+/// The bytes of a file. A large one is mapped where the system can, so that it is never in memory as a whole; what comes
+/// out of a pipe is kept in a temporary file when it is much.
 class FileBytes
 {
 public:
@@ -23,6 +25,10 @@ public:
 
     /// Bytes that are in memory already. @param path  names them in messages
     static std::shared_ptr<const FileBytes> holding(const QString &path, const QByteArray &content);
+    /// What comes out of the program's standard input, until its end. It can be read once only. Its path is "-".
+    static Expected<std::shared_ptr<const FileBytes>> openStandardInput();
+    /// Bytes that were made of a file's.
+    static Expected<std::shared_ptr<const FileBytes>> ofSpooled(const QString &path, SpooledBytes &&bytes);
 
     std::string_view view() const { return view_; }
     const QString &path() const { return path_; }
@@ -33,12 +39,15 @@ public:
     std::optional<InputError> lostBytes() const;
 
 private:
+    static Expected<std::shared_ptr<const FileBytes>> ofHandle(const QString &path, int handle);
     std::optional<QString> read(qint64 size);
+    std::optional<QString> readPipe();
 
     QString path_;
     QFile file_;
     MappedFile mapped_;
-    QByteArray content_; ///< of a file that is not mapped
+    QByteArray content_;   ///< of a file that is not mapped
+    SpooledBytes spooled_; ///< of a pipe
     std::string_view view_;
 };
 

@@ -4,6 +4,7 @@
 #include "Xlate.h"
 
 #include <algorithm>
+#include <array>
 #include <cerrno>
 #include <fcntl.h>
 #include <system_error>
@@ -15,12 +16,12 @@ namespace kareport
 namespace
 {
 
-/// What is read into memory from a pipe or a device, which may never end.
-constexpr qsizetype largestUnmapped = qsizetype(1) << 30;
+/// What is read from a pipe or a device, which may never end.
+constexpr std::size_t largestUnmapped = std::size_t(1) << 30;
 /// A smaller file is read: mapping it, and above all taking the mapping back on every processor, takes longer.
 constexpr qint64 smallestMapped = qint64(1) << 20;
-/// What a pipe is read in at first. The room grows with what comes.
-constexpr qsizetype firstRoom = 64 * 1024;
+/// What a pipe is read in.
+constexpr std::size_t pipeRoom = std::size_t(64) * 1024;
 
 QString systemReason()
 {
@@ -43,11 +44,11 @@ int openHandle(const QString &path)
 }
 
 /// @return the bytes that were read, 0 at the end, and below 0 when reading fails or the program is interrupted
-ssize_t readSome(int handle, char *to, qsizetype most)
+ssize_t readSome(int handle, char *to, std::size_t most)
 {
     ssize_t count = -1;
     do {
-        count = ::read(handle, to, static_cast<std::size_t>(most));
+        count = ::read(handle, to, most);
     } while (count < 0 && errno == EINTR && !isInterrupted());
     return count;
 }
@@ -56,22 +57,33 @@ ssize_t readSome(int handle, char *to, qsizetype most)
 
 Expected<std::shared_ptr<const FileBytes>> FileBytes::open(const QString &path)
 {
+    return ofHandle(path, openHandle(path));
+}
+
+Expected<std::shared_ptr<const FileBytes>> FileBytes::openStandardInput()
+{
+    return ofHandle(QStringLiteral("-"), ::fcntl(STDIN_FILENO, F_DUPFD_CLOEXEC, 0));
+}
+
+/// The bytes of what was opened, which is closed after it; a handle below 0 stands for what could not be opened.
+Expected<std::shared_ptr<const FileBytes>> FileBytes::ofHandle(const QString &path, int handle)
+{
     auto bytes = std::make_shared<FileBytes>();
     bytes->path_ = path;
-    const int handle = openHandle(path);
     if (handle < 0) {
         return InputError{path, std::nullopt, systemReason()};
     }
     bytes->file_.open(handle, QIODevice::ReadOnly | QIODevice::Unbuffered, QFileDevice::AutoCloseHandle);
-    const qint64 size = bytes->file_.size();
+    // Of what was read in part already, as standard input may be, the rest counts.
+    const bool isAtStart = ::lseek(handle, 0, SEEK_CUR) <= 0;
+    const qint64 size = isAtStart ? bytes->file_.size() : 0;
     if (size >= smallestMapped && bytes->mapped_.map(handle, static_cast<std::size_t>(size))) {
         bytes->view_ = bytes->mapped_.view();
         return std::shared_ptr<const FileBytes>(std::move(bytes));
     }
-    if (const auto wrong = bytes->read(size)) {
+    if (const auto wrong = size > 0 ? bytes->read(size) : bytes->readPipe()) {
         return InputError{path, std::nullopt, *wrong};
     }
-    bytes->view_ = {bytes->content_.constData(), static_cast<std::size_t>(bytes->content_.size())};
     return std::shared_ptr<const FileBytes>(std::move(bytes));
 }
 
@@ -84,27 +96,54 @@ std::shared_ptr<const FileBytes> FileBytes::holding(const QString &path, const Q
     return bytes;
 }
 
-/// Reads a file of a size, or until its end one that has none. @return what is wrong with it
+Expected<std::shared_ptr<const FileBytes>> FileBytes::ofSpooled(const QString &path, SpooledBytes &&spooled)
+{
+    auto bytes = std::make_shared<FileBytes>();
+    bytes->path_ = path;
+    bytes->spooled_ = std::move(spooled);
+    if (!bytes->spooled_.finish()) {
+        return InputError{path, std::nullopt, bytes->spooled_.wrong()};
+    }
+    bytes->view_ = bytes->spooled_.view();
+    return std::shared_ptr<const FileBytes>(std::move(bytes));
+}
+
+/// Reads a file of a size. @return what is wrong with it
 std::optional<QString> FileBytes::read(qint64 size)
 {
+    content_.resize(size);
     qsizetype used = 0;
-    for (ssize_t count = 1; count > 0; used += std::max<ssize_t>(count, 0)) {
-        if (used > largestUnmapped) {
-            return Xlate("more than %1 MB come out of what is no file").arg(largestUnmapped >> 20);
-        }
-        if (used == size && size > 0) {
-            break;
-        }
-        if (used == content_.size()) {
-            content_.resize(size > 0 ? qsizetype(size) : std::min(std::max(firstRoom, 2 * used), largestUnmapped + 1));
-        }
-        count = readSome(file_.handle(), content_.data() + used, content_.size() - used);
+    for (ssize_t count = 1; count > 0 && used < size; used += std::max<ssize_t>(count, 0)) {
+        count = readSome(file_.handle(), content_.data() + used, static_cast<std::size_t>(size - used));
         if (count < 0) {
             return systemReason();
         }
     }
-    content_.truncate(used);
+    view_ = {content_.constData(), static_cast<std::size_t>(used)};
     return used < size ? std::optional(cutShort()) : std::nullopt;
+}
+
+/// Reads what has no size until its end. @return what is wrong with it
+std::optional<QString> FileBytes::readPipe()
+{
+    std::array<char, pipeRoom> room;
+    for (ssize_t count = 1; count > 0;) {
+        count = readSome(file_.handle(), room.data(), room.size());
+        if (count < 0) {
+            return systemReason();
+        }
+        if (!spooled_.append({room.data(), static_cast<std::size_t>(count)})) {
+            return spooled_.wrong();
+        }
+        if (spooled_.size() > largestUnmapped) {
+            return Xlate("more than %1 MB come out of what is no file").arg(largestUnmapped >> 20);
+        }
+    }
+    if (!spooled_.finish()) {
+        return spooled_.wrong();
+    }
+    view_ = spooled_.view();
+    return std::nullopt;
 }
 
 std::optional<InputError> FileBytes::lostBytes() const

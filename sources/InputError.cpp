@@ -5,6 +5,11 @@ namespace kareport
 
 QString InputError::message() const
 {
+    return messageAs(QStringLiteral("error"));
+}
+
+QString InputError::messageAs(const QString &word) const
+{
     QString message = file;
     if (place) {
         message += QStringLiteral(":%1:%2").arg(place->line).arg(place->column);
@@ -12,7 +17,7 @@ QString InputError::message() const
     if (!message.isEmpty()) {
         message += QStringLiteral(": ");
     }
-    return message + QStringLiteral("error: ") + text;
+    return message + word + QStringLiteral(": ") + text;
 }
 
 } // namespace kareport

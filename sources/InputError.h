@@ -19,6 +19,8 @@ struct InputError
 
     /// "file:line:column: error: text", without the parts that are not known.
     QString message() const;
+    /// The same with another word in the place of "error".
+    QString messageAs(const QString &word) const;
 };
 
 /// What was read, or what was wrong with it.

@@ -37,13 +37,16 @@ struct RowBatch
 };
 
 /// Reads batches of rows ahead of whoever uses them: while one batch is used, the next is read on another thread. The
-/// first one is read by whoever asks for it: a file of a few rows needs no thread.
+/// first one is read by whoever asks for it: a file of a few rows needs no thread. Where a row may be long in coming, all
+/// are read on the other thread, and whoever asks looks now and then whether work is to stop.
 class RowBatches
 {
 public:
     /// @param fill  reads the next rows into a batch. It is called on a thread of its own but for the first batch, never
     ///              twice at a time, and not any more after the last batch
-    explicit RowBatches(std::function<void(RowBatch &)> fill);
+    /// @param poll  when there is one, it is called a few times a second while a batch is waited for, by whoever waits; all
+    ///              batches are then read on the other thread
+    explicit RowBatches(std::function<void(RowBatch &)> fill, std::function<void()> poll = nullptr);
     ~RowBatches();
     RowBatches(const RowBatches &) = delete;
     RowBatches &operator=(const RowBatches &) = delete;
@@ -53,14 +56,17 @@ public:
 
 private:
     void fill(RowBatch &batch);
-    void readAhead(const std::stop_token &stop);
+    void readAhead(const std::stop_token &stop, std::size_t next);
+    bool startThread(std::size_t next);
+    void waitForBatch();
 
     std::function<void(RowBatch &)> fill_;
+    std::function<void()> poll_;
     InputError noMemory_; ///< made while there is memory: copying it takes none
     std::array<RowBatch, 2> batches_;
     std::size_t used_ = 1;               ///< the batch that was handed out last
     bool isAlone_ = false;               ///< no thread could be had
-    std::counting_semaphore<3> free_{1}; // and one that lets the thread go at the end
+    std::counting_semaphore<3> free_{1}; // of the batches, and one that lets the thread go at the end
     std::counting_semaphore<2> ready_{0};
     std::jthread thread_;
 };

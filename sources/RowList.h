@@ -1,17 +1,27 @@
 #pragma once
 
+#include "ColumnBinding.h"
 #include "InputError.h"
 #include "UDataObjectList.h"
 
 #include <cstddef>
 #include <functional>
 #include <optional>
+#include <vector>
 
 namespace kareport
 {
 
 /// Is told now and then how far reading has come, in the unit that the source counts in. @return false to stop
 using ReadProgress = std::function<bool(std::size_t done)>;
+
+/// The columns of a data source, for whoever says which of them nobody reads.
+struct SourceColumns
+{
+    QString source; ///< what messages call the source: its file, or a connection
+    std::vector<SourceColumn> columns;
+    std::vector<unsigned> ids; ///< the identifiers that values are stored under
+};
 
 /// The rows of a data source as data objects, made while they are asked for in turn. When something is wrong with a row, or
 /// reading is stopped, the list ends there.
@@ -21,6 +31,10 @@ public:
     /// What is wrong with the source or with the row after the last one; nothing when the rows are all good, or reading was
     /// stopped. Asked when the list has been made, when it has been sorted and when it has come to its end.
     virtual std::optional<InputError> error() const = 0;
+
+    /// The columns; nothing while they are not known, as those of a source that shows them with its rows are known after the
+    /// last one only. Asked when the list has been made and when it has come to its end.
+    virtual std::optional<SourceColumns> columns() const { return std::nullopt; }
 };
 
 } // namespace kareport

@@ -1,14 +1,16 @@
 #include "ValueParser.h"
 
+#include "Notation.h"
+#include "NumberText.h"
 #include "VariableType.h"
 #include "Xlate.h"
 
 #include <QLocale>
 
 #include <algorithm>
-#include <charconv>
 #include <cmath>
 #include <limits>
+#include <numbers>
 #include <string>
 
 namespace kareport
@@ -17,87 +19,19 @@ namespace kareport
 namespace
 {
 
-bool isBlank(char character)
+double quarterOf(AngleUnit unit)
 {
-    return character == ' ' || character == '\t';
+    return unit == AngleUnit::Degree ? 90 : unit == AngleUnit::Gon ? 100 : std::numbers::pi / 2;
 }
 
-std::string_view trimmed(std::string_view text)
+/// A thickness as a number in hundredths. What a layer gives is the first of the numbers that are shown so.
+bool parseThickness(std::string_view text, double &number)
 {
-    while (!text.empty() && isBlank(text.front())) {
-        text.remove_prefix(1);
+    if (equalsIgnoringCase(trimmedBlanks(text), "bylayer")) {
+        number = -1;
+        return true;
     }
-    while (!text.empty() && isBlank(text.back())) {
-        text.remove_suffix(1);
-    }
-    return text;
-}
-
-bool isDigit(char character)
-{
-    return character >= '0' && character <= '9';
-}
-
-/// A number too small for a double is 0; one too large is no number.
-bool parseOutOfRange(std::string_view text, double &number)
-{
-    long double wide = 0;
-    const auto result = std::from_chars(text.data(), text.data() + text.size(), wide);
-    number = static_cast<double>(wide);
-    return result.ec == std::errc() && std::isfinite(number);
-}
-
-bool parseWhole(std::string_view text, qint32 &number)
-{
-    text = trimmed(text);
-    if (text.size() > 1 && text.front() == '+' && isDigit(text[1])) {
-        text.remove_prefix(1);
-    }
-    const auto result = std::from_chars(text.data(), text.data() + text.size(), number);
-    return result.ec == std::errc() && result.ptr == text.data() + text.size();
-}
-
-bool equalsIgnoringCase(std::string_view text, std::string_view lower)
-{
-    return std::equal(text.begin(), text.end(), lower.begin(), lower.end(), [](char left, char right) {
-        return (left >= 'A' && left <= 'Z' ? static_cast<char>(left + ('a' - 'A')) : left) == right;
-    });
-}
-
-bool parseBoolean(std::string_view text, bool &value)
-{
-    text = trimmed(text);
-    for (const auto *yes : {"true", "yes", "y", "t", "1", "*"}) {
-        if (equalsIgnoringCase(text, yes)) {
-            value = true;
-            return true;
-        }
-    }
-    for (const auto *no : {"false", "no", "n", "f", "0"}) {
-        if (equalsIgnoringCase(text, no)) {
-            value = false;
-            return true;
-        }
-    }
-    return false;
-}
-
-/// The plus of a station such as 12+345.678 goes; one in front is a sign.
-bool parseStation(std::string_view text, double &number)
-{
-    text = trimmed(text);
-    const std::size_t plus = text.find('+', 1);
-    const std::size_t sign = !text.empty() && (text[0] == '-' || text[0] == '+') ? 1 : 0;
-    const bool grouped = plus != std::string_view::npos && plus > sign && plus + 1 < text.size() &&
-                         std::all_of(text.begin() + static_cast<std::ptrdiff_t>(sign),
-                                     text.begin() + static_cast<std::ptrdiff_t>(plus), isDigit) &&
-                         isDigit(text[plus + 1]) && text.find_first_of("eE") == std::string_view::npos;
-    if (!grouped) {
-        return parseNumber(text, number);
-    }
-    std::string joined(text.substr(0, plus));
-    joined += text.substr(plus + 1);
-    return parseNumber(joined, number);
+    return parseNumber(text, number);
 }
 
 /// A number as a text: whole numbers without an exponent, others with the fewest digits that say them.
@@ -125,57 +59,8 @@ void assignUtf8(QString &target, std::string_view text)
 
 } // namespace
 
-bool parseNumber(std::string_view text, double &number)
-{
-    text = trimmed(text);
-    if (text.size() > 1 && text.front() == '+' && text[1] != '-' && text[1] != '+') {
-        text.remove_prefix(1);
-    }
-    const auto result = std::from_chars(text.data(), text.data() + text.size(), number);
-    if (result.ptr != text.data() + text.size() || text.empty() || text.back() == ')') {
-        return false;
-    }
-    return result.ec == std::errc() || (result.ec == std::errc::result_out_of_range && parseOutOfRange(text, number));
-}
-
-bool parseSexagesimal(std::string_view text, double &degrees)
-{
-    text = trimmed(text);
-    const bool negative = !text.empty() && text.front() == '-';
-    if (!text.empty() && (negative || text.front() == '+')) {
-        text.remove_prefix(1);
-    }
-    constexpr std::string_view marks[] = {"°", "'", "\""};
-    constexpr double partsPerDegree[] = {1, 60, 3600};
-    degrees = 0;
-    for (std::size_t part = 0; part < 3; ++part) {
-        const std::size_t end = std::min(text.find_first_not_of("0123456789."), text.size());
-        double value = 0;
-        const bool isLast = end == text.size() || text.substr(end) == marks[part];
-        if (end == 0 || !parseNumber(text.substr(0, end), value) || (part > 0 && value >= 60) ||
-            (!isLast && value != std::floor(value)))
-        {
-            return false;
-        }
-        degrees += value / partsPerDegree[part];
-        text.remove_prefix(end);
-        if (text.empty() || text == marks[part]) {
-            degrees = negative ? -degrees : degrees;
-            return true;
-        }
-        if (text.starts_with(marks[part])) {
-            text.remove_prefix(marks[part].size());
-        } else if (text.front() == '-') {
-            text.remove_prefix(1);
-        } else {
-            return false;
-        }
-    }
-    return false;
-}
-
 ValueParser::ValueParser(int type, unsigned id, const DataUnits &units)
-    : form_(Form::Number), id_(id), factor_(units.factorOf(type))
+    : form_(Form::Number), id_(id), factor_(units.factorOf(type)), quarter_(quarterOf(units.angle))
 {
     switch (type) {
     case VARIABLE_INTEGER: form_ = Form::Whole; break;
@@ -185,20 +70,42 @@ ValueParser::ValueParser(int type, unsigned id, const DataUnits &units)
     case VARIABLE_BOOLEAN:
     case VARIABLE_FLAG: form_ = Form::Boolean; break;
     case VARIABLE_STATION: form_ = Form::Station; break;
+    case VARIABLE_OFFSET: form_ = Form::Offset; break;
     case VARIABLE_ANGLE:
-    case VARIABLE_VANGLE:
-    case VARIABLE_BEARING: form_ = units.sexagesimal ? Form::Angle : Form::Number; break;
+    case VARIABLE_VANGLE: form_ = units.sexagesimal ? Form::SexagesimalAngle : Form::Angle; break;
+    case VARIABLE_BEARING: form_ = units.sexagesimal ? Form::SexagesimalBearing : Form::Bearing; break;
+    case VARIABLE_THICKNESS: form_ = Form::Thickness; break;
     default: break;
     }
+}
+
+void ValueParser::setNumberStyle(const NumberStyle &style)
+{
+    style_ = style;
+    if (isAngle()) {
+        // The marks of minutes may be those of thousands.
+        style_.thousands.clear();
+    }
+    isPlain_ = style_.isPlain() || form_ == Form::Text || form_ == Form::PointNumber || form_ == Form::Boolean;
 }
 
 /// Whether a text holds blanks alone where a text is not what is wanted.
 bool ValueParser::isBlankNumber(std::string_view text) const
 {
-    return form_ != Form::Text && form_ != Form::PointNumber && trimmed(text).empty();
+    return form_ != Form::Text && form_ != Form::PointNumber && trimmedBlanks(text).empty();
 }
 
 bool ValueParser::storeValue(std::string_view text, UDictionary &object) const
+{
+    if (isPlain_) {
+        return storePlain(text, object);
+    }
+    std::string plain;
+    return toPlainNumbers(trimmedBlanks(text), style_, plain) && storePlain(plain, object);
+}
+
+/// Stores the value of a text whose numbers have a decimal point and no thousands.
+bool ValueParser::storePlain(std::string_view text, UDictionary &object) const
 {
     double number = 0;
     bool fits = false;
@@ -219,10 +126,33 @@ bool ValueParser::storeValue(std::string_view text, UDictionary &object) const
     }
     case Form::Number: fits = parseNumber(text, number); break;
     case Form::Station: fits = parseStation(text, number); break;
-    case Form::Angle: fits = parseSexagesimal(text, number); break;
+    case Form::Offset: fits = parseOffset(text, number); break;
+    case Form::Thickness: fits = parseThickness(text, number); break;
+    default: return storeAngle(text, object);
     }
     object.Refill<double>(id_) = number * factor_;
     return fits;
+}
+
+bool ValueParser::storeAngle(std::string_view text, UDictionary &object) const
+{
+    double number = 0;
+    const bool sexagesimal = form_ == Form::SexagesimalAngle || form_ == Form::SexagesimalBearing;
+    if (sexagesimal ? parseSexagesimal(text, number) : parseNumber(text, number)) {
+        object.Refill<double>(id_) = number * factor_;
+        return true;
+    }
+    const bool isBearing = form_ == Form::Bearing || form_ == Form::SexagesimalBearing;
+    const auto angle = isBearing ? parseBearing(text, quarter_) : parseMarkedAngle(text);
+    if (!angle) {
+        return false;
+    }
+    double factor = factor_;
+    if (angle->unit != NotedAngle::Unit::Data) {
+        factor = std::numbers::pi / (angle->unit == NotedAngle::Unit::Degree ? 180 : 200);
+    }
+    object.Refill<double>(id_) = angle->value * factor;
+    return true;
 }
 
 bool ValueParser::storeNumber(double number, UDictionary &object) const
@@ -241,6 +171,15 @@ bool ValueParser::storeNumber(double number, UDictionary &object) const
     }
 }
 
+bool ValueParser::storeInteger(qint64 number, UDictionary &object) const
+{
+    switch (form_) {
+    case Form::Text: object.Refill<QString>(id_) = QString::number(number); return true;
+    case Form::PointNumber: object.Refill<UPointNumber>(id_).text() = QString::number(number); return true;
+    default: return storeNumber(static_cast<double>(number), object);
+    }
+}
+
 bool ValueParser::storeBoolean(bool value, UDictionary &object) const
 {
     object.Refill<bool>(id_) = value;
@@ -255,7 +194,12 @@ QString ValueParser::expected() const
     case Form::PointNumber: return Xlate("a text");
     case Form::Boolean: return Xlate("yes or no");
     case Form::Station: return Xlate("a station such as 12+345.678");
-    case Form::Angle: return Xlate("an angle such as 45-30-15");
+    case Form::Offset: return Xlate("a number, or an offset such as 12.5R");
+    case Form::Thickness: return Xlate("a number, or ByLayer");
+    case Form::Angle: return Xlate("a number, or an angle such as 45°30'15\"");
+    case Form::Bearing: return Xlate("a number, or a bearing such as N45-30-15E");
+    case Form::SexagesimalAngle: return Xlate("an angle such as 45-30-15");
+    case Form::SexagesimalBearing: return Xlate("a bearing such as 45-30-15 or N45-30-15E");
     case Form::Number: break;
     }
     return Xlate("a number");

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "DataUnits.h"
+#include "NumberStyle.h"
 #include "UDictionary.h"
 
 #include <QString>
@@ -21,6 +22,9 @@ public:
 
     unsigned id() const { return id_; }
 
+    /// Says how the numbers of the texts are written. Angles have no thousands.
+    void setNumberStyle(const NumberStyle &style);
+
     /// Whether a text stands for no value: an empty one, and blanks where a text is not what is wanted.
     bool isNone(std::string_view text) const
     {
@@ -35,6 +39,8 @@ public:
     bool storeValue(std::string_view text, UDictionary &object) const;
     /// Stores a number that is one already. @return whether it fits the type
     bool storeNumber(double number, UDictionary &object) const;
+    /// The same for a whole number, which a text shows with all its digits.
+    bool storeInteger(qint64 number, UDictionary &object) const;
     bool storeBoolean(bool value, UDictionary &object) const;
 
     /// What a text of the type looks like, for a message that says what was expected.
@@ -49,22 +55,28 @@ private:
         Boolean,
         Number,
         Station,
-        Angle ///< in degrees, minutes and seconds
+        Offset,
+        Thickness,
+        Angle,
+        Bearing,
+        SexagesimalAngle, ///< numbers are degrees, minutes and seconds
+        SexagesimalBearing
     };
 
     bool isBlankNumber(std::string_view text) const;
+    bool isAngle() const { return form_ >= Form::Angle; }
+    bool storePlain(std::string_view text, UDictionary &object) const;
+    bool storeAngle(std::string_view text, UDictionary &object) const;
 
     Form form_;
     unsigned id_;
     double factor_;
+    double quarter_;      ///< of a circle in the unit of the data's numbers
+    bool isPlain_ = true; ///< numbers, if it reads any, have a decimal point and no thousands
+    NumberStyle style_;
 };
 
 /// Finds the variable of a column: its parser, or nothing when the dictionary does not know the name.
 using FindVariable = std::function<std::optional<ValueParser>(const QString &name)>;
-
-/// A number as data files write it, INF and NAN among them; blanks around it and one sign are allowed.
-bool parseNumber(std::string_view text, double &number);
-/// An angle such as -45-30-15.5 or 45°30'15", in degrees. Minutes and seconds may be missing.
-bool parseSexagesimal(std::string_view text, double &degrees);
 
 } // namespace kareport

@@ -29,15 +29,25 @@ bool isUtf8(std::string_view text)
 } // namespace
 
 CsvReader::CsvReader(const QString &path, std::string_view bytes, char delimiter)
-    : path_(path), bytes_(bytes), delimiter_(delimiter)
+    : CsvReader(path, bytes, Layout{delimiter, false, 0, std::nullopt, false})
+{}
+
+CsvReader::CsvReader(const QString &path, std::string_view bytes, const Layout &layout)
+    : path_(path), bytes_(bytes), layout_(layout), passesLines_(layout.comment || layout.passesBlankLines)
 {
     std::fill(classes_.begin() + 0x80, classes_.end(), high);
-    for (const char character : {delimiter, '"', '\r', '\n', '\0'}) {
+    for (const char character : {layout_.delimiter, '"', '\r', '\n', '\0'}) {
         classes_[static_cast<unsigned char>(character)] = special;
+    }
+    if (layout_.whitespace) {
+        classes_[static_cast<unsigned char>(layout_.delimiter)] = ordinary;
+        classes_[' '] = special;
+        classes_['\t'] = special;
     }
     if (bytes_.starts_with(byteOrderMark)) {
         position_ = byteOrderMark.size();
     }
+    skipLines();
 }
 
 void CsvReader::seek(std::size_t rowStart, qsizetype line)
@@ -49,14 +59,20 @@ void CsvReader::seek(std::size_t rowStart, qsizetype line)
 
 bool CsvReader::next()
 {
-    if (error_ || skipEmptyEnd()) {
+    if (error_) {
+        return false;
+    }
+    if (passesLines_) {
+        passOverLines();
+    }
+    if (skipEmptyEnd()) {
         return false;
     }
     rowStart_ = position_;
     rowLine_ = line_;
     rawCells_.clear();
     hasHighBytes_ = false;
-    if (!scanRow()) {
+    if (layout_.whitespace ? !scanSpacedRow() : !scanRow()) {
         return false;
     }
     const std::string_view row = bytes_.substr(rowStart_, position_ - rowStart_);
@@ -77,18 +93,9 @@ bool CsvReader::next()
     return true;
 }
 
-/// Blank lines at the end of the file are no rows.
-bool CsvReader::skipEmptyEnd()
-{
-    const std::size_t text = bytes_.find_first_not_of("\r\n", position_);
-    if (text == std::string_view::npos) {
-        position_ = bytes_.size();
-    }
-    return position_ == bytes_.size();
-}
-
 bool CsvReader::scanRow()
 {
+    const char delimiter = layout_.delimiter;
     const std::size_t limit = std::min(bytes_.size(), rowStart_ + longestRow + 1); // with its line end
     std::size_t cellStart = position_;
     std::size_t at = position_;
@@ -100,7 +107,7 @@ bool CsvReader::scanRow()
             continue;
         }
         const char character = bytes_[at];
-        if (character == delimiter_) {
+        if (character == delimiter) {
             rawCells_.push_back({cellStart, at, false, false});
             cellStart = ++at;
         } else if (character == '\n' || character == '\r') {
@@ -115,15 +122,12 @@ bool CsvReader::scanRow()
             if (at == bytes_.size() || bytes_[at] == '\n' || bytes_[at] == '\r') {
                 return endRow(at);
             }
-            if (bytes_[at] != delimiter_) {
-                return fail(at, Xlate("a delimiter was expected behind the closing quote"));
+            if (bytes_[at] != delimiter) {
+                return fail(at, Xlate("a delimiter was expected after the closing quote"));
             }
             cellStart = ++at;
-        } else if (character == '"') {
-            return fail(at, Xlate("a quote inside a cell was not expected: the whole cell must stand in quotes and the "
-                                  "quote be doubled"));
         } else {
-            return fail(at, Xlate("a zero byte stands in the file: a text file was expected"));
+            return failInCell(at);
         }
     }
     if (at - rowStart_ > longestRow) {
@@ -131,6 +135,52 @@ bool CsvReader::scanRow()
     }
     rawCells_.push_back({cellStart, at, false, false});
     return endRow(at);
+}
+
+/// Reads a row whose cells have blanks and tabs between them.
+bool CsvReader::scanSpacedRow()
+{
+    const std::size_t limit = std::min(bytes_.size(), rowStart_ + longestRow + 1);
+    std::size_t at = position_;
+    while (at < limit) {
+        const char first = bytes_[at];
+        if (first == ' ' || first == '\t') {
+            ++at;
+            continue;
+        }
+        if (first == '\n' || first == '\r') {
+            return endRow(at);
+        }
+        if (first == '"') {
+            position_ = at;
+            if (!scanQuoted(limit)) {
+                return false;
+            }
+            at = position_;
+            if (at < bytes_.size() && std::string_view(" \t\r\n").find(bytes_[at]) == std::string_view::npos) {
+                return fail(at, Xlate("a delimiter was expected after the closing quote"));
+            }
+            continue;
+        }
+        const std::size_t cellStart = at;
+        for (; at < limit && classes_[static_cast<unsigned char>(bytes_[at])] != special; ++at) {
+            hasHighBytes_ |= classes_[static_cast<unsigned char>(bytes_[at])] == high;
+        }
+        if (at < limit && (bytes_[at] == '"' || bytes_[at] == '\0')) {
+            return failInCell(at);
+        }
+        rawCells_.push_back({cellStart, at, false, false});
+    }
+    return at - rowStart_ > longestRow ? failTooLong() : endRow(at);
+}
+
+/// Says what is wrong with a character that stands nowhere in a plain cell.
+bool CsvReader::failInCell(std::size_t at)
+{
+    return fail(at, bytes_[at] == '"'
+                        ? Xlate("a quote inside a cell was not expected: the whole cell must stand in quotes "
+                                "and the quote be doubled")
+                        : Xlate("a zero byte stands in the file: a text file was expected"));
 }
 
 /// Reads a quoted cell from its opening quote to after its closing one.
@@ -198,23 +248,6 @@ void CsvReader::takeCells()
         }
         cells_.push_back(single);
     }
-}
-
-TextPlace CsvReader::placeOf(std::size_t at) const
-{
-    const std::string_view before = bytes_.substr(rowStart_, at - rowStart_);
-    const auto lines = std::count(before.begin(), before.end(), '\n');
-    const std::size_t lineStart = lines == 0 ? 0 : before.rfind('\n') + 1;
-    const std::string_view line = before.substr(lineStart);
-    const auto characters = std::count_if(line.begin(), line.end(),
-                                          [](char byte) { return (static_cast<unsigned char>(byte) & 0xC0) != 0x80; });
-    return {rowLine_ + lines, characters + 1};
-}
-
-TextPlace CsvReader::placeOfCell(std::size_t cell) const
-{
-    const RawCell &raw = rawCells_[std::min(cell, rawCells_.size() - 1)];
-    return placeOf(raw.quoted ? raw.begin - 1 : raw.begin);
 }
 
 bool CsvReader::failTooLong()

@@ -7,6 +7,7 @@
 
 #include <array>
 #include <cstddef>
+#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -14,15 +15,27 @@
 namespace kareport
 {
 
-/// Reads a CSV text (RFC 4180, UTF-8 with or without a byte-order mark) row by row, in one pass.
+/// Reads a CSV text (RFC 4180, UTF-8 with or without a byte-order mark) row by row, in one pass. With other delimiters, and
+/// lines that are passed over, it reads any text of rows and cells.
 class CsvReader
 {
 public:
+    /// How rows and cells are told apart.
+    struct Layout
+    {
+        char delimiter = ',';    ///< one ASCII character
+        bool whitespace = false; ///< blanks and tabs, as many as there are, delimit; those around a row do not count
+        qsizetype skip = 0;      ///< lines that are passed over at the beginning, whatever they hold
+        std::optional<char> comment;   ///< a line that begins with this ASCII character is passed over
+        bool passesBlankLines = false; ///< lines of nothing, or of blanks and tabs alone, are passed over
+    };
+
     /// Longer rows are taken for something that is no CSV.
     static constexpr std::size_t longestRow = std::size_t(1) << 20;
 
     /// @param path  names the file in errors
     CsvReader(const QString &path, std::string_view bytes, char delimiter);
+    CsvReader(const QString &path, std::string_view bytes, const Layout &layout);
 
     /// Reads the next row. @return false at the end, and when something is wrong with the row
     bool next();
@@ -41,7 +54,7 @@ public:
     /// Continues at the start of a row that was read before.
     void seek(std::size_t rowStart, qsizetype line);
 
-    /// The place of a cell of the row.
+    /// The place of a cell of the row; after the last one, that of the last.
     TextPlace placeOfCell(std::size_t cell) const;
     InputError errorAt(TextPlace place, const QString &text) const { return {path_, place, text}; }
 
@@ -54,7 +67,13 @@ private:
         bool quoted;
     };
 
+    void skipLines();
+    void passOverLines();
+    bool isPassedOver() const;
+    void passOverLine();
     bool scanRow();
+    bool scanSpacedRow();
+    bool failInCell(std::size_t at);
     bool scanQuoted(std::size_t limit);
     bool endRow(std::size_t end);
     void takeCells();
@@ -65,7 +84,8 @@ private:
 
     QString path_;
     std::string_view bytes_;
-    char delimiter_;
+    Layout layout_;
+    bool passesLines_; ///< comments or blank lines
     std::size_t position_ = 0;
     std::size_t rowStart_ = 0;
     qsizetype line_ = 1;

@@ -160,4 +160,54 @@ TEST(FileBytesPosix, BytesInMemoryNeedNoFile)
     EXPECT_EQ(bytes->view(), "abc");
 }
 
+/// Lets a file be the standard input of the program.
+class StandardInput
+{
+public:
+    explicit StandardInput(int handle) : before_(dup(STDIN_FILENO)) { dup2(handle, STDIN_FILENO); }
+    ~StandardInput()
+    {
+        dup2(before_, STDIN_FILENO);
+        close(before_);
+    }
+    StandardInput(const StandardInput &) = delete;
+    StandardInput &operator=(const StandardInput &) = delete;
+
+private:
+    int before_;
+};
+
+TEST(FileBytesPosix, StandardInputIsReadFromWhereItStands)
+{
+    for (const qsizetype size : {qsizetype(0), qsizetype(100), qsizetype(3'000'000)}) {
+        for (const off_t start : {off_t(0), off_t(7)}) {
+            const JobFolder folder;
+            const QByteArray content = "skipped" + QByteArray(size, 'x');
+            folder.put("f.csv", content);
+            const int handle = open(qPrintable(folder.path("f.csv")), O_RDONLY);
+            ASSERT_EQ(lseek(handle, start, SEEK_SET), start);
+            const StandardInput input(handle);
+            const auto opened = FileBytes::openStandardInput();
+            ASSERT_EQ(errorOf(opened), nullptr);
+            const auto &bytes = std::get<std::shared_ptr<const FileBytes>>(opened);
+            EXPECT_EQ(bytes->path(), QStringLiteral("-"));
+            EXPECT_EQ(bytes->view().size(), std::size_t(content.size() - start)) << "as a file from " << start;
+            EXPECT_FALSE(bytes->lostBytes());
+            close(handle);
+        }
+        int ends[2] = {};
+        ASSERT_EQ(pipe(ends), 0);
+        std::jthread writer([&] {
+            QFile file;
+            EXPECT_TRUE(file.open(ends[1], QIODevice::WriteOnly, QFileDevice::AutoCloseHandle));
+            EXPECT_EQ(file.write(QByteArray(size, 'y')), size);
+        });
+        const StandardInput input(ends[0]);
+        const auto opened = FileBytes::openStandardInput();
+        ASSERT_EQ(errorOf(opened), nullptr);
+        EXPECT_EQ(std::get<std::shared_ptr<const FileBytes>>(opened)->view().size(), std::size_t(size)) << "as a pipe";
+        close(ends[0]);
+    }
+}
+
 } // namespace

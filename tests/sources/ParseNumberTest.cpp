@@ -1,4 +1,5 @@
-#include "ValueParser.h"
+#include "Notation.h"
+#include "NumberText.h"
 
 #include <gtest/gtest.h>
 
@@ -76,19 +77,19 @@ TEST(ParseNumber, RefusesWhatIsNone)
         {"+-1", "two signs"},
         {"-+1", "two signs"},
         {"++1", "two signs"},
-        {"- 1", "a blank behind the sign"},
+        {"- 1", "a blank after the sign"},
         {"1,5", "a decimal comma"},
         {"1 000", "a blank inside"},
         {"1.2.3", "two points"},
         {"0x10", "no other base"},
-        {"12abc", "letters behind it"},
-        {"12 m", "a unit behind it"},
+        {"12abc", "letters after it"},
+        {"12 m", "a unit after it"},
         {"12+345.678", "a station is no plain number"},
         {"nan(1)", "what only C writes"},
         {"infinit", "half a word"},
         {"1e400", "out of range"},
         {"-1e400", "out of range below 0"},
-        {std::string_view("1\0", 2), "a zero byte behind it"},
+        {std::string_view("1\0", 2), "a zero byte after it"},
         {"\xD9\xA1", "digits of another script"},
         {"\xC2\xA0"
          "1",
@@ -186,11 +187,11 @@ TEST(ParseSexagesimal, RefusesWhatIsNone)
         {"45.5-30-15", "decimals of degrees before minutes"},
         {"45-30.5-15", "decimals of minutes before seconds"},
         {"45-30-15-10", "a fourth part"},
-        {"45-30-15\"x", "something behind it"},
+        {"45-30-15\"x", "something after it"},
         {"45'30\"", "minutes without degrees in front"},
         {"45\xC2\xB0"
          "30\"",
-         "the mark of seconds behind minutes"},
+         "the mark of seconds after minutes"},
         {"45 30 15", "blanks between"},
         {"45:30:15", "colons between"},
         {"45\xB0"

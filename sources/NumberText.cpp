@@ -1,0 +1,147 @@
+#include "NumberText.h"
+
+#include <QUtf8StringView>
+
+#include <algorithm>
+#include <charconv>
+#include <cmath>
+
+namespace kareport
+{
+
+namespace
+{
+
+bool isBlank(char character)
+{
+    return character == ' ' || character == '\t';
+}
+
+bool isDigit(char character)
+{
+    return character >= '0' && character <= '9';
+}
+
+/// A number too small for a double is 0; one too large is no number.
+bool parseOutOfRange(std::string_view text, double &number)
+{
+    long double wide = 0;
+    const auto result = std::from_chars(text.data(), text.data() + text.size(), wide);
+    number = static_cast<double>(wide);
+    return result.ec == std::errc() && std::isfinite(number);
+}
+
+/// Takes the digits at a position, with groups of three after a mark where there are such. @return whether they are groups
+bool takeDigits(std::string_view text, std::string_view mark, std::size_t &at, std::string &result)
+{
+    const std::size_t start = at;
+    for (; at < text.size() && isDigit(text[at]); ++at) {
+        result += text[at];
+    }
+    const bool mayHaveGroups = !mark.empty() && at - start <= 3;
+    while (mayHaveGroups && text.substr(at).starts_with(mark) && at + mark.size() < text.size() &&
+           isDigit(text[at + mark.size()]))
+    {
+        const std::string_view group = text.substr(at + mark.size());
+        const std::size_t digits = std::min(group.find_first_not_of("0123456789"), group.size());
+        if (digits != 3) {
+            return false;
+        }
+        result += group.substr(0, digits);
+        at += mark.size() + digits;
+    }
+    return true;
+}
+
+} // namespace
+
+std::string_view trimmedBlanks(std::string_view text)
+{
+    while (!text.empty() && isBlank(text.front())) {
+        text.remove_prefix(1);
+    }
+    while (!text.empty() && isBlank(text.back())) {
+        text.remove_suffix(1);
+    }
+    return text;
+}
+
+bool equalsIgnoringCase(std::string_view text, std::string_view lower)
+{
+    return std::equal(text.begin(), text.end(), lower.begin(), lower.end(), [](char left, char right) {
+        return (left >= 'A' && left <= 'Z' ? static_cast<char>(left + ('a' - 'A')) : left) == right;
+    });
+}
+
+bool parseNumber(std::string_view text, double &number)
+{
+    text = trimmedBlanks(text);
+    if (text.size() > 1 && text.front() == '+' && text[1] != '-' && text[1] != '+') {
+        text.remove_prefix(1);
+    }
+    const auto result = std::from_chars(text.data(), text.data() + text.size(), number);
+    if (result.ptr != text.data() + text.size() || text.empty() || text.back() == ')') {
+        return false;
+    }
+    return result.ec == std::errc() || (result.ec == std::errc::result_out_of_range && parseOutOfRange(text, number));
+}
+
+bool parseWhole(std::string_view text, qint32 &number)
+{
+    text = trimmedBlanks(text);
+    if (text.size() > 1 && text.front() == '+' && isDigit(text[1])) {
+        text.remove_prefix(1);
+    }
+    const auto result = std::from_chars(text.data(), text.data() + text.size(), number);
+    return result.ec == std::errc() && result.ptr == text.data() + text.size();
+}
+
+bool parseBoolean(std::string_view text, bool &value)
+{
+    text = trimmedBlanks(text);
+    for (const auto *yes : {"true", "yes", "y", "t", "1", "*"}) {
+        if (equalsIgnoringCase(text, yes)) {
+            value = true;
+            return true;
+        }
+    }
+    for (const auto *no : {"false", "no", "n", "f", "0"}) {
+        if (equalsIgnoringCase(text, no)) {
+            value = false;
+            return true;
+        }
+    }
+    return false;
+}
+
+bool isPlainText(std::string_view text)
+{
+    return text.find('\0') == std::string_view::npos &&
+           QUtf8StringView(text.data(), static_cast<qsizetype>(text.size())).isValidUtf8();
+}
+
+bool toPlainNumbers(std::string_view text, const NumberStyle &style, std::string &result)
+{
+    result.clear();
+    bool isFraction = false;
+    for (std::size_t at = 0; at < text.size();) {
+        if (isDigit(text[at])) {
+            if (!takeDigits(text, isFraction ? std::string_view() : style.thousands, at, result)) {
+                return false;
+            }
+            continue;
+        }
+        const bool isMark = !style.thousands.empty() && text.substr(at).starts_with(style.thousands);
+        const bool isBeforeDigit =
+            isMark && at + style.thousands.size() < text.size() && isDigit(text[at + style.thousands.size()]);
+        isFraction = text[at] == style.decimal;
+        if ((text[at] == '.' && !isFraction) || isBeforeDigit) {
+            return false;
+        }
+        result += isFraction ? '.' : text[at];
+        ++at;
+    }
+    return true;
+}
+
+} // namespace kareport

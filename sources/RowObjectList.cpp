@@ -1,0 +1,242 @@
+#include "RowObjectList.h"
+
+#include "EntryOrder.h"
+#include "WideVectors.h"
+
+#include <algorithm>
+#include <numeric>
+
+namespace kareport
+{
+
+RowObjectList::RowObjectList(std::unique_ptr<RowReader> reader, ReadProgress progress)
+    : reader_(std::move(reader)), progress_(std::move(progress)), error_(endOfRows(reader_->error()))
+{}
+
+RowObjectList::~RowObjectList()
+{
+    if (batches_) {
+        reader_->stop(); // the thread that reads ahead ends with its batch
+    }
+}
+
+UDataObject *RowObjectList::GetAt(std::size_t index)
+{
+    if (stopped_ || (error_ && batch_ == nullptr)) {
+        return nullptr;
+    }
+    if (batch_ == nullptr || index < batchStart_) {
+        static const RowBatch nothing;
+        restart();
+        batch_ = &nothing;
+        batches_ = std::make_unique<RowBatches>(
+            [this](RowBatch &batch) { fill(batch); },
+            reader_->mayWait() && !spool_ ? std::function<void()>([this] { poll(); }) : nullptr);
+    }
+    while (index - batchStart_ >= batch_->count) {
+        if (!takeBatch()) {
+            return nullptr;
+        }
+    }
+    return const_cast<UDataObject *>(&batch_->objects[index - batchStart_]);
+}
+
+std::optional<SourceColumns> RowObjectList::columns() const
+{
+    if (error_ || !reader_->knowsColumns()) {
+        return std::nullopt;
+    }
+    return SourceColumns{reader_->name(), reader_->columns(), reader_->ids()};
+}
+
+/// Goes back to the first row, with no batch read.
+void RowObjectList::restart()
+{
+    batches_.reset();
+    if (!spool_) {
+        reader_->rewind();
+    }
+    nextOrdered_ = 0;
+    error_.reset();
+    batch_ = nullptr;
+    batchStart_ = 0;
+}
+
+/// Why the rows end where they do. What was cut off a file while it was read shows as rows that are wrong.
+std::optional<InputError> RowObjectList::endOfRows(const std::optional<InputError> &error) const
+{
+    const auto lost = reader_->lostBytes();
+    return lost ? lost : error;
+}
+
+/// Goes on to the next batch. @return false when there is none
+bool RowObjectList::takeBatch()
+{
+    if (batch_->isLast) {
+        error_ = endOfRows(batch_->error);
+        return false;
+    }
+    batchStart_ += batch_->count;
+    batch_ = &batches_->next();
+    position_ = batch_->position;
+    stopped_ = stopped_ || (progress_ && !progress_(position_));
+    return !stopped_;
+}
+
+/// Looks whether work is to stop while a row is waited for.
+void RowObjectList::poll()
+{
+    if (!stopped_ && progress_ && !progress_(position_)) {
+        stopped_ = true;
+        reader_->stop();
+    }
+}
+
+void RowObjectList::fill(RowBatch &batch)
+{
+    std::size_t bytes = 0;
+    while (batch.count < RowBatch::most && bytes < RowBatch::mostBytes && !batch.isLast) {
+        batch.isLast = spool_ ? !readFromSpool(batch, bytes) : !readRow(batch, bytes);
+    }
+    batch.position = reader_->position();
+}
+
+/// Goes to the next row of a sorted list. @return false after the last one
+bool RowObjectList::seekNext()
+{
+    if (order_) {
+        if (nextOrdered_ == order_->size()) {
+            return false;
+        }
+        reader_->seek((*order_)[nextOrdered_++]);
+    }
+    return true;
+}
+
+bool RowObjectList::readRow(RowBatch &batch, std::size_t &bytes)
+{
+    if (!seekNext()) {
+        return false;
+    }
+    endWideVectors();
+    if (!reader_->next(batch.next(), nullptr)) {
+        batch.error = reader_->error();
+        return false;
+    }
+    bytes += reader_->rowBytes();
+    ++batch.count;
+    return true;
+}
+
+bool RowObjectList::readFromSpool(RowBatch &batch, std::size_t &bytes)
+{
+    if (!order_ || nextOrdered_ == order_->size()) {
+        return false;
+    }
+    const std::size_t start = (*order_)[nextOrdered_++].start;
+    bytes += spool_->read(start, batch.next()) - start;
+    ++batch.count;
+    return true;
+}
+
+void RowObjectList::Sort(const std::vector<unsigned> &ids)
+{
+    if (error_ || stopped_) {
+        return;
+    }
+    if (!reader_->canSeek() && !spool_ && !spoolRows()) {
+        return;
+    }
+    const std::vector<Key> keys = spool_ ? keysOfSpooled(ids) : keysOfPlaces(ids);
+    if (!stopped_ && !error_) {
+        sortPlaces(keys, ids);
+    }
+    batches_.reset();
+    batch_ = nullptr;
+}
+
+/// The sort keys of all rows, in the order that the rows have, so that equal ones keep it.
+std::vector<RowObjectList::Key> RowObjectList::keysOfPlaces(const std::vector<unsigned> &ids)
+{
+    restart();
+    std::vector<Key> keys;
+    Key key;
+    while (seekNext() && reader_->next(key.values, &ids)) {
+        key.place = reader_->place();
+        keys.push_back(std::move(key));
+        key.values.Clear();
+        if (progress_ && keys.size() % RowBatch::most == 0 && !progress_(reader_->position())) {
+            stopped_ = true;
+            return keys;
+        }
+    }
+    error_ = endOfRows(reader_->error());
+    return keys;
+}
+
+/// Reads all rows into a temporary file. @return false when work is to stop or something is wrong
+bool RowObjectList::spoolRows()
+{
+    auto spool = std::make_unique<RowSpool>(reader_->ids());
+    bool isKept = true;
+    for (std::size_t i = 0; isKept; ++i) {
+        const UDataObject *object = GetAt(i);
+        if (object == nullptr) {
+            break;
+        }
+        isKept = spool->add(*object);
+    }
+    batches_.reset();
+    batch_ = nullptr;
+    if (!isKept || (!error_ && !spool->finish())) {
+        error_ = InputError{QString(), std::nullopt, spool->wrong()};
+    }
+    if (stopped_ || error_) {
+        return false;
+    }
+    spool_ = std::move(spool);
+    return true;
+}
+
+std::vector<RowObjectList::Key> RowObjectList::keysOfSpooled(const std::vector<unsigned> &ids)
+{
+    std::vector<Key> keys;
+    UDataObject object;
+    const auto addKey = [&](std::size_t place) {
+        Key &key = keys.emplace_back();
+        key.place = {place, 0};
+        const std::size_t next = spool_->read(place, object);
+        for (const unsigned id : ids) {
+            if (const UDictEntry *entry = object.Find(id)) {
+                key.values.Set(id, entry->value());
+            }
+        }
+        return next;
+    };
+    if (order_) {
+        for (const RowPlace &place : *order_) {
+            addKey(place.start);
+        }
+        return keys;
+    }
+    for (std::size_t place = 0; place < spool_->end();) {
+        place = addKey(place);
+    }
+    return keys;
+}
+
+void RowObjectList::sortPlaces(const std::vector<Key> &keys, const std::vector<unsigned> &ids)
+{
+    std::vector<std::size_t> order(keys.size());
+    std::iota(order.begin(), order.end(), std::size_t(0));
+    std::stable_sort(order.begin(), order.end(), [&](std::size_t left, std::size_t right) {
+        return compareObjects(keys[left].values, keys[right].values, ids) < 0;
+    });
+    order_.emplace();
+    order_->reserve(order.size());
+    for (const std::size_t index : order) {
+        order_->push_back(keys[index].place);
+    }
+}
+
+} // namespace kareport

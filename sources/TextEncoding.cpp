@@ -1,0 +1,161 @@
+#include "TextEncoding.h"
+
+#include "SpooledBytes.h"
+#include "Xlate.h"
+
+#include <QChar>
+
+#include <algorithm>
+#include <array>
+#include <string>
+#include <string_view>
+
+namespace kareport
+{
+
+namespace
+{
+
+/// What the bytes from 0x80 to 0x9F are in Windows-1252; 0 is no character.
+constexpr std::array<char16_t, 32> windowsCharacters = {0x20AC, 0,      0x201A, 0x0192, 0x201E, 0x2026, 0x2020, 0x2021,
+                                                        0x02C6, 0x2030, 0x0160, 0x2039, 0x0152, 0,      0x017D, 0,
+                                                        0,      0x2018, 0x2019, 0x201C, 0x201D, 0x2022, 0x2013, 0x2014,
+                                                        0x02DC, 0x2122, 0x0161, 0x203A, 0x0153, 0,      0x017E, 0x0178};
+
+void appendUtf8(std::string &out, char32_t character)
+{
+    const auto append = [&out](char32_t byte) { out += static_cast<char>(byte); };
+    if (character < 0x80) {
+        append(character);
+    } else if (character < 0x800) {
+        append(0xC0 | character >> 6);
+        append(0x80 | (character & 0x3F));
+    } else if (character < 0x10000) {
+        append(0xE0 | character >> 12);
+        append(0x80 | (character >> 6 & 0x3F));
+        append(0x80 | (character & 0x3F));
+    } else {
+        append(0xF0 | character >> 18);
+        append(0x80 | (character >> 12 & 0x3F));
+        append(0x80 | (character >> 6 & 0x3F));
+        append(0x80 | (character & 0x3F));
+    }
+}
+
+/// Takes characters from the bytes of a text, one after the other.
+class CharacterReader
+{
+public:
+    CharacterReader(std::string_view bytes, TextEncoding encoding) : bytes_(bytes), encoding_(encoding)
+    {
+        if (encoding_ == TextEncoding::Utf16) {
+            isBigEndian_ = bytes_.starts_with("\xFE\xFF");
+            hasMark_ = isBigEndian_ || bytes_.starts_with("\xFF\xFE");
+            at_ = 2;
+        }
+    }
+
+    bool hasMark() const { return encoding_ != TextEncoding::Utf16 || hasMark_; }
+    bool atEnd() const { return at_ >= bytes_.size(); }
+
+    /// The next character; nothing when the bytes are none.
+    std::optional<char32_t> next()
+    {
+        if (encoding_ == TextEncoding::Utf16) {
+            return nextOfUtf16();
+        }
+        const auto byte = static_cast<unsigned char>(bytes_[at_++]);
+        if (encoding_ == TextEncoding::Latin1 || byte < 0x80 || byte >= 0xA0) {
+            return byte;
+        }
+        const char16_t character = windowsCharacters[byte - 0x80U];
+        return character != 0 ? std::optional<char32_t>(character) : std::nullopt;
+    }
+
+private:
+    std::optional<char16_t> unit()
+    {
+        if (bytes_.size() - at_ < 2) {
+            at_ = bytes_.size();
+            return std::nullopt;
+        }
+        const auto first = static_cast<unsigned char>(bytes_[at_]);
+        const auto second = static_cast<unsigned char>(bytes_[at_ + 1]);
+        at_ += 2;
+        return static_cast<char16_t>(isBigEndian_ ? first << 8 | second : second << 8 | first);
+    }
+
+    std::optional<char32_t> nextOfUtf16()
+    {
+        const auto first = unit();
+        if (!first || !QChar::isSurrogate(*first)) {
+            return first;
+        }
+        const auto second = QChar::isHighSurrogate(*first) && !atEnd() ? unit() : std::nullopt;
+        return second && QChar::isLowSurrogate(*second) ? std::optional(QChar::surrogateToUcs4(*first, *second))
+                                                        : std::nullopt;
+    }
+
+    std::string_view bytes_;
+    TextEncoding encoding_;
+    std::size_t at_ = 0;
+    bool isBigEndian_ = false;
+    bool hasMark_ = false;
+};
+
+QString wrongCharacter(TextEncoding encoding)
+{
+    return encoding == TextEncoding::Utf16
+               ? Xlate("the file is not UTF-16")
+               : Xlate("the file is not Windows-1252: it has a byte that is no character there");
+}
+
+} // namespace
+
+std::optional<TextEncoding> textEncodingFromKey(QStringView key)
+{
+    struct Key
+    {
+        QStringView name;
+        TextEncoding encoding;
+    };
+    constexpr Key keys[] = {{u"utf-8", TextEncoding::Utf8},
+                            {u"latin-1", TextEncoding::Latin1},
+                            {u"windows-1252", TextEncoding::Windows1252},
+                            {u"utf-16", TextEncoding::Utf16}};
+    const auto *found =
+        std::find_if(std::begin(keys), std::end(keys), [key](const Key &one) { return one.name == key; });
+    return found != std::end(keys) ? std::optional(found->encoding) : std::nullopt;
+}
+
+Expected<std::shared_ptr<const FileBytes>> toUtf8(std::shared_ptr<const FileBytes> file, TextEncoding encoding)
+{
+    if (encoding == TextEncoding::Utf8) {
+        return file;
+    }
+    CharacterReader reader(file->view(), encoding);
+    if (!reader.hasMark()) {
+        return InputError{file->path(), TextPlace(),
+                          Xlate("the file has no byte-order mark: UTF-16 with its mark was expected")};
+    }
+    SpooledBytes spooled;
+    TextPlace place;
+    while (!reader.atEnd()) {
+        const auto character = reader.next();
+        if (!character) {
+            const auto lost = file->lostBytes();
+            return lost ? *lost : InputError{file->path(), place, wrongCharacter(encoding)};
+        }
+        appendUtf8(spooled.buffer(), *character);
+        place = *character == U'\n' ? TextPlace{place.line + 1, 1} : TextPlace{place.line, place.column + 1};
+        if (!spooled.flushFull()) {
+            return InputError{file->path(), std::nullopt, spooled.wrong()};
+        }
+    }
+    if (const auto lost = file->lostBytes()) {
+        return *lost;
+    }
+    return FileBytes::ofSpooled(file->path(), std::move(spooled));
+}
+
+} // namespace kareport

@@ -1,0 +1,31 @@
+#pragma once
+
+#include "FileBytes.h"
+#include "InputError.h"
+
+#include <QStringView>
+
+#include <memory>
+#include <optional>
+
+namespace kareport
+{
+
+/// How the characters of a text file are written.
+enum class TextEncoding
+{
+    Utf8,
+    Latin1,
+    Windows1252,
+    Utf16 ///< with a byte-order mark, which says the order of the bytes
+};
+
+/// The encoding of a key such as "utf-8", "latin-1", "windows-1252" or "utf-16"; nothing for any other text. Case matters.
+std::optional<TextEncoding> textEncodingFromKey(QStringView key);
+
+/// The bytes of a text file as UTF-8; lines and columns are the same. A text that is UTF-8 already is handed back as it is; its
+/// characters are not looked at. Any other is read as a whole, into a temporary file when it is large.
+/// @return an error with its place where a character is none of the encoding
+Expected<std::shared_ptr<const FileBytes>> toUtf8(std::shared_ptr<const FileBytes> file, TextEncoding encoding);
+
+} // namespace kareport

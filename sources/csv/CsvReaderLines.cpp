@@ -1,0 +1,72 @@
+#include "CsvReader.h"
+
+#include <algorithm>
+
+// What a reader does with lines: those that are passed over, and the places of what stands in them.
+
+namespace kareport
+{
+
+void CsvReader::skipLines()
+{
+    for (qsizetype i = 0; i < layout_.skip && position_ < bytes_.size(); ++i) {
+        passOverLine();
+    }
+}
+
+/// Passes over lines that are no rows.
+void CsvReader::passOverLines()
+{
+    while (position_ < bytes_.size() && isPassedOver()) {
+        passOverLine();
+    }
+}
+
+bool CsvReader::isPassedOver() const
+{
+    if (bytes_[position_] == layout_.comment) {
+        return true;
+    }
+    const std::size_t text = layout_.passesBlankLines ? bytes_.find_first_not_of(" \t\r", position_) : position_;
+    return layout_.passesBlankLines && (text == std::string_view::npos || bytes_[text] == '\n');
+}
+
+void CsvReader::passOverLine()
+{
+    const std::size_t end = bytes_.find('\n', position_);
+    position_ = end == std::string_view::npos ? bytes_.size() : end + 1;
+    ++line_;
+}
+
+/// Blank lines at the end of the file are no rows.
+bool CsvReader::skipEmptyEnd()
+{
+    const char *blank = layout_.whitespace ? " \t\r\n" : "\r\n";
+    const std::size_t text = bytes_.find_first_not_of(blank, position_);
+    if (text == std::string_view::npos) {
+        position_ = bytes_.size();
+    }
+    return position_ == bytes_.size();
+}
+
+TextPlace CsvReader::placeOf(std::size_t at) const
+{
+    const std::string_view before = bytes_.substr(rowStart_, at - rowStart_);
+    const auto lines = std::count(before.begin(), before.end(), '\n');
+    const std::size_t lineStart = lines == 0 ? 0 : before.rfind('\n') + 1;
+    const std::string_view line = before.substr(lineStart);
+    const auto characters = std::count_if(line.begin(), line.end(),
+                                          [](char byte) { return (static_cast<unsigned char>(byte) & 0xC0) != 0x80; });
+    return {rowLine_ + lines, characters + 1};
+}
+
+TextPlace CsvReader::placeOfCell(std::size_t cell) const
+{
+    if (rawCells_.empty()) {
+        return placeOf(rowStart_);
+    }
+    const RawCell &raw = rawCells_[std::min(cell, rawCells_.size() - 1)];
+    return placeOf(raw.quoted ? raw.begin - 1 : raw.begin);
+}
+
+} // namespace kareport

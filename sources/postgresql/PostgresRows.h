@@ -1,0 +1,64 @@
+#pragma once
+
+#include "GeometryColumns.h"
+#include "PostgresConnection.h"
+#include "PostgresObjectList.h"
+#include "RowReader.h"
+
+#include <QHash>
+
+#include <optional>
+#include <string_view>
+#include <vector>
+
+namespace kareport
+{
+
+/// The rows of a query of a PostgreSQL database.
+class PostgresRows : public RowReader
+{
+public:
+    /// Connects and finds the columns; no row is read. @param isToStop  asked meanwhile
+    PostgresRows(const PostgresQuery &query, const Variables &variables, const std::function<bool()> &isToStop);
+
+    bool next(UDataObject &object, const std::vector<unsigned> *onlyIds) override;
+    void rewind() override;
+    std::size_t position() const override { return row_; }
+    std::size_t rowBytes() const override { return rowBytes_; }
+    QString name() const override { return connection_.name(); }
+    bool mayWait() const override { return true; }
+    void stop() override { connection_.stop(); }
+
+private:
+    /// Where the value of a field comes from.
+    struct Source
+    {
+        int column = -1; ///< of the answer
+        std::optional<GeometryPart> part;
+    };
+
+    bool prepare(const PostgresQuery &query);
+    bool findColumns(const PGresult *description);
+    std::optional<int> geometryColumnOf(const PGresult *description, const std::vector<Oid> &types);
+    bool bindColumns(const PostgresQuery &query, const Variables &variables);
+    void readSystems();
+    bool storeRow(const PGresult *row, UDataObject &object);
+    bool storeCell(const BoundField &field, const PGresult *row, int column, UDataObject &object);
+    bool readGeometry(const PGresult *row);
+    bool fail(const QString &text);
+    bool failInRow(const QString &text);
+
+    PostgresConnection connection_;
+    std::vector<std::optional<QByteArray>> parameters_;
+    std::size_t ownColumns_ = 0;        ///< columns of the data itself; those of a geometry follow
+    std::optional<int> geometryColumn_; ///< of the answer
+    bool needsGeometry_ = false;
+    std::vector<Source> sources_; ///< of the fields
+    QHash<qint32, ReferenceSystem> systems_;
+    std::optional<PointGeometry> point_; ///< of the row
+    bool isSent_ = false;
+    std::size_t row_ = 0;
+    std::size_t rowBytes_ = 0;
+};
+
+} // namespace kareport

@@ -1,0 +1,69 @@
+#pragma once
+
+#include "InputError.h"
+
+#include <QDateTime>
+#include <QString>
+#include <QStringList>
+
+#include <atomic>
+#include <memory>
+#include <optional>
+
+#include <sqlite3.h>
+
+namespace kareport
+{
+
+/// A statement of a database, which must live longer.
+using SqliteStatement = std::unique_ptr<sqlite3_stmt, int (*)(sqlite3_stmt *)>;
+
+/// A SQLite database that is read, in one state from the opening to the end. Its file is never written. What other programs
+/// have written and not yet moved into the file counts.
+class SqliteFile
+{
+public:
+    /// Opens a database. `error` says what is wrong with it.
+    explicit SqliteFile(const QString &path);
+    ~SqliteFile();
+    SqliteFile(const SqliteFile &) = delete;
+    SqliteFile &operator=(const SqliteFile &) = delete;
+
+    const std::optional<InputError> &error() const { return error_; }
+    const QString &path() const { return path_; }
+
+    /// A statement of SQL that was made here.
+    SqliteStatement prepare(const QString &sql);
+    /// The statement of a query that somebody wrote: one SELECT and nothing else.
+    Expected<SqliteStatement> prepareQuery(const QString &sql);
+
+    /// Names of its tables and views, but for those that belong to the format.
+    QStringList tables();
+
+    /// What the last call has to say. An answer that means no memory throws `std::bad_alloc`.
+    InputError failure(int code) const;
+    /// Whether the file was changed by somebody who did not go through SQLite.
+    std::optional<InputError> changed() const;
+
+    /// Ends what is running, from any thread.
+    void stop() { isStopped_ = true; }
+    bool isStopped() const { return isStopped_; }
+
+private:
+    void configure();
+    bool begin();
+    QString reasonOf(int code) const;
+
+    QString path_;
+    sqlite3 *database_ = nullptr;
+    std::optional<InputError> error_;
+    std::atomic<bool> isStopped_ = false;
+    bool hasLog_ = false; ///< other programs may write to it meanwhile, into a log beside it
+    qint64 size_ = 0;
+    QDateTime modified_;
+};
+
+/// A text of a statement's column.
+QString textOfColumn(sqlite3_stmt *statement, int column);
+
+} // namespace kareport

@@ -1,0 +1,34 @@
+#pragma once
+
+#include "ColumnBinding.h"
+#include "RowObjectList.h"
+
+#include <QString>
+
+#include <vector>
+
+namespace kareport
+{
+
+/// What is read from a SQLite database, a GeoPackage among them: all rows of a table or a view, or what a query answers.
+struct SqliteQuery
+{
+    QString file;
+    QString table; ///< empty for a query
+    QString query; ///< one SELECT
+    std::vector<ColumnChoice> columns;
+};
+
+/// The rows of a SQLite database as data objects.
+///
+/// The database is opened for reading only and all rows are of one state of it; NULL is no value. Where a column holds the
+/// geometries of a GeoPackage there are the columns @x, @y and @z of its points, @srs, their reference system as
+/// "EPSG:25832", and @srsName, its name: variables are read from them where they are chosen.
+class SqliteObjectList : public RowObjectList
+{
+public:
+    /// Opens the database and finds the columns.
+    SqliteObjectList(const SqliteQuery &query, const Variables &variables, ReadProgress progress);
+};
+
+} // namespace kareport

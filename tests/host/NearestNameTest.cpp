@@ -1,0 +1,50 @@
+#include "NearestName.h"
+
+#include <gtest/gtest.h>
+
+namespace
+{
+
+using kareport::didYouMean;
+using kareport::nearestName;
+
+TEST(NearestName, FindsWhatSomebodyMayHaveMeant)
+{
+    const QStringList known = {"Number", "Northing", "Easting", "Elevation", "Description", "Dx", "Dy"};
+    struct Row
+    {
+        const char *misspelt;
+        const char *expected;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {"Elev", "Elevation", "its beginning"},
+        {"elev", "Elevation", "its beginning in another case"},
+        {"Elevations", "Elevation", "a letter too many"},
+        {"Elevatoin", "Elevation", "two letters exchanged"},
+        {"Nothing", "Northing", "a letter is missing"},
+        {"Nortking", "Northing", "a wrong letter"},
+        {"EASTNIG", "Easting", "in capitals"},
+        {"Descr", "Description", "its beginning"},
+        {"DX1", "Dx", "a letter too many after a short name"},
+        {"Dz", "Dx", "of names equally near, the first"},
+        {"El", "", "a beginning of two letters is none"},
+        {"Zzz", "", "nothing is near"},
+        {"", "", "nothing"},
+        {"Q", "", "all letters would be wrong"},
+    };
+    for (const Row &row : rows) {
+        EXPECT_EQ(nearestName(QString::fromUtf8(row.misspelt), known).toStdString(), row.expected)
+            << row.misspelt << ": " << row.reason;
+    }
+    EXPECT_TRUE(nearestName(u"Elev", {}).isEmpty());
+    EXPECT_FALSE(nearestName(QString(100000, u'x'), {QString(100000, u'x') + u'y'}).isEmpty()) << "long names, soon";
+}
+
+TEST(NearestName, Asks)
+{
+    EXPECT_EQ(didYouMean(u"Elev", {"Elevation"}).toStdString(), "did you mean \"Elevation\"?");
+    EXPECT_EQ(didYouMean(u"Zzz", {"Elevation"}).toStdString(), "");
+}
+
+} // namespace
