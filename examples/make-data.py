@@ -1,6 +1,6 @@
 #!/usr/bin/env python3
-"""Computes the survey data that the sample jobs show, and writes it into the folder data beside this file: as CSV, and
-one road as LandXML.
+"""Computes the survey data that the sample jobs show, and writes it into the folder data beside this file: as CSV, the
+control points as a point file and a GeoPackage as well, and one road as LandXML.
 
 Everything is worked out from a few design values, so the figures of a report agree with each other: the legs of the
 traverse with its coordinates, the points set out with the alignment, cut and fill with the two elevations. Running it
@@ -9,9 +9,12 @@ again writes the same bytes. Only the standard library is needed.
     python3 examples/make-data.py
 """
 
+import contextlib
 import csv
 import math
 import random
+import sqlite3
+import struct
 from pathlib import Path
 
 DATA = Path(__file__).resolve().parent / "data"
@@ -366,8 +369,50 @@ def write_control(road):
                      "yes" if held else "no", f"{PLACES[i * 7 // 3 % len(PLACES)]}, {kind}"])
     # Measured from the far end in three days, the days out of turn.
     third = count // 3
-    write("control.csv", ["Number", "Northing", "Easting", "Elevation", "Order", "Held", "Description"],
-          rows[2 * third:] + rows[:third] + rows[third:2 * third])
+    measured = rows[2 * third:] + rows[:third] + rows[third:2 * third]
+    write("control.csv", ["Number", "Northing", "Easting", "Elevation", "Order", "Held", "Description"], measured)
+    write_points(measured)
+    write_package(measured)
+
+
+def write_points(rows):
+    """The same points as an instrument gives them: number, northing, easting, elevation, description, without a header."""
+    with open(DATA / "control.pts", "w", encoding="utf-8", newline="") as file:
+        csv.writer(file, lineterminator="\n").writerows([*row[:4], row[6]] for row in rows)
+
+
+def point_geometry(north, east, height):
+    """A point with an elevation as a GeoPackage stores it: a header without an envelope, then well-known binary."""
+    return b"GP\0\x01" + struct.pack("<i", -1) + struct.pack("<BIddd", 1, 1001, east, north, height)
+
+
+def write_package(rows):
+    """The same points as a layer of a GeoPackage, their coordinates in its geometries."""
+    path = DATA / "control.gpkg"
+    path.unlink(missing_ok=True)
+    with contextlib.closing(sqlite3.connect(path, isolation_level=None)) as package:
+        package.executescript("""
+            PRAGMA application_id = 1196444487;
+            PRAGMA user_version = 10300;
+            BEGIN;
+            CREATE TABLE gpkg_spatial_ref_sys (srs_name TEXT NOT NULL, srs_id INTEGER PRIMARY KEY,
+                organization TEXT NOT NULL, organization_coordsys_id INTEGER NOT NULL, definition TEXT NOT NULL,
+                description TEXT);
+            INSERT INTO gpkg_spatial_ref_sys VALUES ('Undefined Cartesian', -1, 'NONE', -1, 'undefined', NULL);
+            CREATE TABLE gpkg_contents (table_name TEXT NOT NULL PRIMARY KEY, data_type TEXT NOT NULL, identifier TEXT,
+                description TEXT, last_change TEXT NOT NULL, min_x REAL, min_y REAL, max_x REAL, max_y REAL, srs_id INTEGER);
+            INSERT INTO gpkg_contents VALUES ('control', 'features', 'control', '', '2024-03-05T14:07:00.000Z', NULL, NULL,
+                NULL, NULL, -1);
+            CREATE TABLE gpkg_geometry_columns (table_name TEXT NOT NULL PRIMARY KEY, column_name TEXT NOT NULL,
+                geometry_type_name TEXT NOT NULL, srs_id INTEGER NOT NULL, z INTEGER NOT NULL, m INTEGER NOT NULL);
+            INSERT INTO gpkg_geometry_columns VALUES ('control', 'geom', 'POINT', -1, 1, 0);
+            CREATE TABLE control (fid INTEGER PRIMARY KEY AUTOINCREMENT, geom POINT, number TEXT, grade INTEGER,
+                held BOOLEAN, description TEXT);
+            """)
+        package.executemany("INSERT INTO control (geom, number, grade, held, description) VALUES (?, ?, ?, ?, ?)",
+                            [(point_geometry(float(north), float(east), float(height)), number, order, held == "yes", text)
+                             for number, north, east, height, order, held, text in rows])
+        package.execute("COMMIT")
 
 
 # ------------------------------------------------------------------------------------- the road as a designer's file

@@ -12,12 +12,15 @@
 #include <QMargins>
 #include <QString>
 
+#include <memory>
 #include <optional>
 #include <variant>
 #include <vector>
 
 namespace kareport
 {
+
+class DataSource;
 
 /// What a report is made of: a job file that has been read, or the short form of the command line. File names are
 /// complete.
@@ -52,8 +55,8 @@ struct Job
     };
     struct DataSet
     {
-        QString csv; ///< empty when the values stand in the job
-        char delimiter = ',';
+        QString kind;                             ///< the key of its kind, whose value says where the data is
+        std::shared_ptr<const DataSource> source; ///< never null in a job that was read
         DataUnits units;
     };
 
@@ -102,6 +105,7 @@ struct Job
     };
 
     std::optional<QString> title;
+    bool strict = false; ///< a note on the report is an error
     QString application = QStringLiteral("TALVEN");
     bool header = true;
     std::optional<QDateTime> now;
@@ -121,7 +125,8 @@ struct TemplateJob
     QString templateName;
     QString table; ///< or a block
     QString block;
-    QString data; ///< a CSV file
+    QString data;                 ///< a CSV file, "-" for standard input
+    QJsonObject dataOptions = {}; ///< what else the data set says, such as its delimiter
 
     /// The content of the job file that it stands for.
     QJsonObject toJson() const;

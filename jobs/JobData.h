@@ -1,13 +1,11 @@
 #pragma once
 
-#include "FileBytes.h"
+#include "DataKind.h"
 #include "Job.h"
 #include "JsonSource.h"
 #include "Progress.h"
 #include "RowList.h"
-#include "ValueParser.h"
 
-#include <QHash>
 #include <QString>
 
 #include <functional>
@@ -20,6 +18,9 @@ namespace kareport
 class JobData
 {
 public:
+    /// Finds the variables of a dictionary, for numbers in the given units.
+    using VariablesIn = std::function<Variables(const DataUnits &)>;
+
     /// @param source     the job file, for the values in it and for the places of errors
     /// @param progress   shows how far a data file has been read
     /// @param isStopped  is asked now and then; its true ends the rows
@@ -28,23 +29,19 @@ public:
     {}
 
     /// Opens a data set that the job has.
-    /// @param findVariable  types the rows
-    /// @param firstOnly     whether one row is enough where the others cost nothing to leave out
-    Expected<std::unique_ptr<RowList>> open(const QString &name, const FindVariable &findVariable, bool firstOnly);
+    /// @param firstOnly  whether one row is enough where the others cost nothing to leave out
+    Expected<std::unique_ptr<RowList>> open(const QString &name, const VariablesIn &variablesIn, bool firstOnly);
 
     /// What is wrong with a data set that has no row.
     /// @param step  needs one
     InputError noRow(const QString &name, const JsonPath &step) const;
 
 private:
-    Expected<std::unique_ptr<RowList>> openCsv(const QString &name, const Job::DataSet &set,
-                                               const FindVariable &findVariable);
-
     const Job &job_;
     const JsonSource &source_;
     Progress &progress_;
     std::function<bool()> isStopped_;
-    QHash<QString, std::shared_ptr<const FileBytes>> files_; ///< by their paths
+    DataFiles files_;
 };
 
 } // namespace kareport

@@ -1,5 +1,6 @@
 #include "JobFiles.h"
 
+#include "DataKind.h"
 #include "FileIdentity.h"
 #include "Xlate.h"
 
@@ -20,9 +21,8 @@ QHash<QString, QString> sourcesOf(const Job &job, const QString &path)
 {
     QHash<QString, QString> sources;
     for (const Job::DataSet &set : job.data) {
-        if (!set.csv.isEmpty()) {
-            sources.insert(fileIdentity(set.csv),
-                           Xlate("\"%1\" is data of the job: an output of its own was expected"));
+        for (const QString &file : set.source->files()) {
+            sources.insert(fileIdentity(file), Xlate("\"%1\" is data of the job: an output of its own was expected"));
         }
     }
     if (job.reportTemplate) {
@@ -77,9 +77,10 @@ bool isUpToDate(const Job &job, const QString &path)
         sources.append(job.reportTemplate->file);
     }
     for (const Job::DataSet &set : job.data) {
-        if (!set.csv.isEmpty()) {
-            sources.append(set.csv);
+        if (!set.source->isAllInFiles()) {
+            return false;
         }
+        sources += set.source->files();
     }
     return !job.outputs.empty() && std::all_of(job.outputs.begin(), job.outputs.end(), [&](const Output &output) {
         const QFileInfo written(output.file);

@@ -1,6 +1,8 @@
 #include "JobReader.h"
 
 #include "ApplicationTitle.h"
+#include "JobDataReader.h"
+#include "JobFileName.h"
 #include "JobSettings.h"
 #include "JobStepsReader.h"
 #include "JsonNode.h"
@@ -111,54 +113,6 @@ Job::Options readOptions(const JsonNode &node)
     return options;
 }
 
-/// The system takes a file name for ended at a character 0, and would open another file.
-QString readFileName(const JsonNode &node)
-{
-    const QString name = node.text();
-    if (name.contains(QChar::Null)) {
-        node.fail(Xlate("a file name without a character 0 was expected"));
-    }
-    return name;
-}
-
-QHash<QString, Job::DataSet> readData(const JsonNode &node, const QDir &folder)
-{
-    QHash<QString, Job::DataSet> sets;
-    if (!node.expectObject()) {
-        return sets;
-    }
-    for (const QString &name : node.keys()) {
-        const JsonNode set = node[name];
-        if (!set.expectObject()) {
-            break;
-        }
-        set.allowOnly({"csv", "delimiter", "values", "units"});
-        Job::DataSet read;
-        read.units = readDataUnits(set["units"]);
-        const JsonNode csv = set["csv"];
-        const JsonNode values = set["values"];
-        if (csv.exists() == values.exists()) {
-            set.fail(Xlate("either \"csv\" or \"values\" was expected"));
-        } else if (csv.exists()) {
-            read.csv = folder.filePath(readFileName(csv));
-        } else if (!values.value().isArray() && !values.value().isObject()) {
-            values.fail(Xlate("an object or a list of objects was expected"));
-        }
-        if (const JsonNode delimiter = set["delimiter"]; delimiter.exists()) {
-            const QString text = delimiter.text();
-            if (text.size() != 1 || text[0].unicode() > 127 || QStringLiteral("\"\r\n").contains(text[0]) ||
-                text[0].isNull()) {
-                delimiter.fail(
-                    Xlate("a text of one ASCII character that is neither a quote nor a line end was expected"));
-            } else {
-                read.delimiter = text[0].toLatin1();
-            }
-        }
-        sets.insert(name, read);
-    }
-    return sets;
-}
-
 std::optional<Output> readOutput(const JsonNode &node, const QDir &folder, std::optional<OutputKind> otherwise)
 {
     if (node.value().isObject()) {
@@ -223,11 +177,11 @@ std::optional<Job::Template> readTemplate(const JsonNode &node, const QDir &fold
     return Job::Template{templatePath(readFileName(node["file"]), folder, installed), node["name"].text()};
 }
 
-Job readRoot(const JsonNode &root, const QDir &folder, const JobDefaults &defaults)
+Job readRoot(const JsonNode &root, const QDir &folder, bool isOnInput, const JobDefaults &defaults)
 {
     Job job;
-    root.allowOnly({"title", "application", "header", "now", "page", "settings", "template", "options", "data",
-                    "report", "output"});
+    root.allowOnly({"title", "application", "strict", "header", "now", "page", "settings", "template", "options",
+                    "data", "report", "output"});
     if (const JsonNode title = root["title"]; title.exists()) {
         job.title = title.text();
     }
@@ -237,13 +191,14 @@ Job readRoot(const JsonNode &root, const QDir &folder, const JobDefaults &defaul
             application.fail(Xlate("a text that begins with \"%1\" was expected").arg(GetApplicationTitle()));
         }
     }
+    job.strict = root["strict"].boolean(false);
     job.header = root["header"].boolean(true);
     job.now = readTime(root["now"]);
     job.page = readPage(root["page"], defaults.page);
     job.settings = readSettings(root["settings"], defaults.settings);
     job.reportTemplate = readTemplate(root["template"], folder, QDir(defaults.templateFolder));
     job.options = readOptions(root["options"]);
-    job.data = readData(root["data"], folder);
+    job.data = readDataSets(root["data"], folder, isOnInput);
     job.steps = readSteps(root["report"], job);
     if (const JsonNode outputs = root["output"]; outputs.expectArray()) {
         for (qsizetype i = 0; i < outputs.size(); ++i) {
@@ -261,7 +216,7 @@ Expected<Job> readJob(const JsonSource &source, const JobDefaults &defaults)
 {
     std::optional<InputError> error;
     const QDir folder = source.path().isEmpty() ? QDir::current() : QFileInfo(source.path()).absoluteDir();
-    Job job = readRoot(JsonNode(source, error), folder, defaults);
+    Job job = readRoot(JsonNode(source, error), folder, source.path() == u"-", defaults);
     if (error) {
         return *std::move(error);
     }
@@ -274,10 +229,12 @@ QJsonObject TemplateJob::toJson() const
     const bool isTable = !table.isEmpty();
     const QJsonObject step = {{isTable ? QStringLiteral("table") : QStringLiteral("block"), isTable ? table : block},
                               {set, set}};
+    QJsonObject dataSet = dataOptions;
+    dataSet.insert(QStringLiteral("csv"), data);
     return {
         {QStringLiteral("template"),
          QJsonObject{{QStringLiteral("file"), templateFile}, {QStringLiteral("name"), templateName}}},
-        {set, QJsonObject{{set, QJsonObject{{QStringLiteral("csv"), data}}}}},
+        {set, QJsonObject{{set, dataSet}}},
         {QStringLiteral("report"), QJsonArray{step}},
     };
 }

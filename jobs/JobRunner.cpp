@@ -1,6 +1,7 @@
 #include "JobRunner.h"
 
 #include "Clock.h"
+#include "DataRemarks.h"
 #include "Interrupt.h"
 #include "JobSteps.h"
 #include "ReportTextCodec.h"
@@ -52,7 +53,10 @@ ReportSurroundings surroundingsOf(const Job &job)
 
 std::optional<InputError> JobRunner::run(UReportDoc &report, ReportTextWriter *stream)
 {
-    report.SetSurroundings(surroundingsOf(job_));
+    DataRemarks remarks;
+    ReportSurroundings surroundings = surroundingsOf(job_);
+    surroundings.remarks = &remarks;
+    report.SetSurroundings(surroundings);
     const auto restored = qScopeGuard([&report] { report.SetSurroundings(std::nullopt); });
     if (auto error = prepare(report)) {
         return error;
@@ -62,7 +66,8 @@ std::optional<InputError> JobRunner::run(UReportDoc &report, ReportTextWriter *s
         return isInterrupted() || (stream != nullptr && stream->hasFailed()) || (isToStop_ && isToStop_());
     };
     JobData data(job_, source_, progress_, isStopped);
-    return JobSteps(job_, source_, data, report, isStopped).write();
+    notes_ = JobNotes();
+    return JobSteps(job_, source_, data, report, {notes_, isStrict_ || job_.strict, remarks}, isStopped).write();
 }
 
 std::optional<InputError> JobRunner::prepare(UReportDoc &report)

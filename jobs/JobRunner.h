@@ -2,6 +2,7 @@
 
 #include "InputError.h"
 #include "Job.h"
+#include "JobNotes.h"
 #include "JsonSource.h"
 #include "Progress.h"
 #include "ReportSurroundings.h"
@@ -31,6 +32,11 @@ public:
     /// Is asked now and then, besides the interrupts, whether the work is to stop.
     void stopWhen(std::function<bool()> isToStop) { isToStop_ = std::move(isToStop); }
 
+    /// Makes a note an error: the report is not made then, and the notes so far are kept.
+    void beStrict() { isStrict_ = true; }
+    /// The notes on the report that was made last, also on one that was not finished.
+    const JobNotes &notes() const { return notes_; }
+
     /// Writes the job's report. Its surroundings are the job's until it has been written; then the program's hold for it.
     /// @param report  a new one, which must stay open. In a program whose preferences must not matter it is made with
     ///                `surroundingsOf` the job
@@ -49,6 +55,8 @@ private:
     const JsonSource &source_;
     Progress &progress_;
     std::function<bool()> isToStop_;
+    bool isStrict_ = false;
+    JobNotes notes_;
 };
 
 } // namespace kareport

@@ -142,6 +142,9 @@ DataUnits readDataUnits(const JsonNode &node)
         return units;
     }
     node.allowOnly({"length", "area", "angle"});
+    units.isLengthSaid = node["length"].exists();
+    units.isAreaSaid = node["area"].exists();
+    units.isAngleSaid = node["angle"].exists();
     choose(node["length"], lengthUnitFromKey, lengthKeys, units.length);
     choose(node["area"], areaUnitFromKey, areaKeys, units.area);
     const JsonNode angle = node["angle"];

@@ -4,6 +4,7 @@
 #include "UXmlReportTpl.h"
 #include "Xlate.h"
 
+#include <algorithm>
 #include <new>
 
 namespace kareport
@@ -86,6 +87,9 @@ JobSteps::Wrong JobSteps::write(const Job::Block &step, const JsonPath &path)
     if (auto error = rows.error()) {
         return error;
     }
+    if (auto wrong = noteColumns(rows, step.data, *block, Xlate("block"), path)) {
+        return wrong;
+    }
     if (const UDataObject *object = rows.GetAt(0)) {
         needMemory(report_.WriteDataBlock(step.name, object, step.before, step.after));
         return std::nullopt;
@@ -109,8 +113,18 @@ JobSteps::Wrong JobSteps::write(const Job::Table &step, const JsonPath &path)
         return *error;
     }
     RowList &rows = *std::get<std::unique_ptr<RowList>>(opened);
+    // Columns that are known already are looked at before hundreds of thousands of rows are.
+    if (auto wrong = noteColumns(rows, step.data, *table, Xlate("table"), path)) {
+        return wrong;
+    }
     needMemory(report_.WriteDataTable(step.name, &rows, step.before, step.after, step.headingAfter));
-    return rows.error();
+    if (const auto error = rows.error()) {
+        return error;
+    }
+    if (auto wrong = noteColumns(rows, step.data, *table, Xlate("table"), path)) {
+        return wrong;
+    }
+    return isStopped_() ? std::nullopt : noteValues(rows, step.name, path);
 }
 
 JobSteps::Wrong JobSteps::noSuchRecord(const QString &what, const QString &name, const QStringList &names,
@@ -141,20 +155,94 @@ JobSteps::Wrong JobSteps::wrongRecord(const Record &record, const QString &what,
     return std::nullopt;
 }
 
+/// Notes what of the data and of a table or block does not come together, once the columns are known.
+template <typename Record>
+JobSteps::Wrong JobSteps::noteColumns(const RowList &rows, const QString &data, const Record &record,
+                                      const QString &what, const JsonPath &path)
+{
+    const auto columns = rows.columns();
+    if (!columns) {
+        return std::nullopt;
+    }
+    const UXmlReportTpl &tpl = *report_.GetTemplate();
+    const sXmlReportDictionary &dictionary = *tpl.GetDictionary(record.Use);
+    auto wrong = notes_.add(unknownColumns(*columns, dictionary));
+    const auto unfilled = unfilledFields(*columns, record.Fields, dictionary);
+    for (const UnfilledField &field : unfilled) {
+        const QString sentence =
+            Xlate("no column fills the field \"%1\" of the %2 \"%3\"").arg(field.variable, what, record.Name);
+        const auto note = source_.errorAt(
+            path, field.question.isEmpty() ? sentence : sentence + QStringLiteral(": ") + field.question);
+        auto other = notes_.add({{JobNote::Kind::UnfilledField, note}});
+        wrong = wrong ? wrong : other;
+    }
+    const Job::DataSet &set = *job_.data.constFind(data);
+    if (!set.source->hasOwnUnits()) {
+        for (const QString &key : assumedUnits(*columns, dictionary, set.units)) {
+            const QString text =
+                Xlate("the data \"%1\" does not say the unit of its numbers: %2 was taken").arg(data, key);
+            notes_.add({{JobNote::Kind::AssumedUnit, source_.errorAt({QStringLiteral("data"), data}, text)}});
+        }
+    }
+    return wrong;
+}
+
+/// Notes which values of a table that was written do not show as they are.
+JobSteps::Wrong JobSteps::noteValues(const RowList &rows, const QString &table, const JsonPath &path)
+{
+    Wrong wrong;
+    const auto columns = rows.columns();
+    const auto note = [&](JobNote::Kind kind, const QString &text, const ValueCount &values) {
+        auto one = notes_.add({{kind, source_.errorAt(path, text), values.firstLine, values.count, values.firstRow}});
+        wrong = wrong ? wrong : one;
+    };
+    for (const ColumnRemarks &column : notes_.remarks.columns) {
+        if (column.tooWide.count > 0) {
+            const QString sentence =
+                job_.options.printHash ? Xlate("%1 values are wider than the field \"%2\" of the table \"%3\" and show "
+                                               "as #, the first one in row %4, line %5 of the report")
+                                       : Xlate("%1 values are wider than the field \"%2\" of the table \"%3\", the "
+                                               "first one in row %4, line %5 of the report");
+            note(JobNote::Kind::WideValue,
+                 sentence.arg(QString::number(column.tooWide.count), column.variable, table,
+                              QString::number(column.tooWide.firstRow), QString::number(column.tooWide.firstLine)),
+                 column.tooWide);
+        }
+        // Of a field that no column fills there is a note already.
+        const bool isFilled =
+            !columns || std::find(columns->ids.begin(), columns->ids.end(), column.id) != columns->ids.end();
+        if (column.missing.count > 0 && isFilled) {
+            note(
+                JobNote::Kind::MissingValue,
+                Xlate(
+                    "%1 values of the field \"%2\" of the table \"%3\" are missing and show as 0, the first one in row "
+                    "%4, line %5 of the report")
+                    .arg(QString::number(column.missing.count), column.variable, table,
+                         QString::number(column.missing.firstRow), QString::number(column.missing.firstLine)),
+                column.missing);
+        }
+    }
+    return wrong;
+}
+
 /// The rows of a data set, typed by a dictionary of the template.
 Expected<std::unique_ptr<RowList>> JobSteps::openRows(const QString &data, const QString &dictionary, bool firstOnly)
 {
     const UXmlReportTpl *tpl = report_.GetTemplate();
-    const DataUnits units = job_.data.constFind(data)->units;
-    const FindVariable findVariable = [tpl, units, dictionary](const QString &variable) -> std::optional<ValueParser> {
-        qint32 id = 0;
-        qint32 type = 0;
-        if (!tpl->FindVariable(dictionary, variable, id, type)) {
-            return std::nullopt;
-        }
-        return ValueParser(type, static_cast<unsigned>(id), units);
+    const JobData::VariablesIn variablesIn = [tpl, dictionary](const DataUnits &units) {
+        Variables variables;
+        variables.find = [tpl, units, dictionary](const QString &variable) -> std::optional<ValueParser> {
+            qint32 id = 0;
+            qint32 type = 0;
+            if (!tpl->FindVariable(dictionary, variable, id, type)) {
+                return std::nullopt;
+            }
+            return ValueParser(type, static_cast<unsigned>(id), units);
+        };
+        variables.names = variableNames(*tpl->GetDictionary(dictionary));
+        return variables;
     };
-    return data_.open(data, findVariable, firstOnly);
+    return data_.open(data, variablesIn, firstOnly);
 }
 
 } // namespace kareport

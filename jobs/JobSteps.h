@@ -1,5 +1,6 @@
 #pragma once
 
+#include "ColumnNotes.h"
 #include "InputError.h"
 #include "Job.h"
 #include "JobData.h"
@@ -17,10 +18,11 @@ class JobSteps
 {
 public:
     /// @param source     the job file, for the places of errors
+    /// @param notes      receive what somebody should know of the report
     /// @param isStopped  is asked after each step
-    JobSteps(const Job &job, const JsonSource &source, JobData &data, UReportDoc &report,
+    JobSteps(const Job &job, const JsonSource &source, JobData &data, UReportDoc &report, StepNotes notes,
              const std::function<bool()> &isStopped)
-        : job_(job), source_(source), data_(data), report_(report), isStopped_(isStopped)
+        : job_(job), source_(source), data_(data), report_(report), notes_(notes), isStopped_(isStopped)
     {}
 
     /// @return what is wrong with a step or with its data; nothing when all steps were written or the work was stopped
@@ -42,11 +44,16 @@ private:
     template <typename Record>
     Wrong wrongRecord(const Record &record, const QString &what, const QString &name, const JsonPath &path) const;
     Expected<std::unique_ptr<RowList>> openRows(const QString &data, const QString &dictionary, bool firstOnly);
+    template <typename Record>
+    Wrong noteColumns(const RowList &rows, const QString &data, const Record &record, const QString &what,
+                      const JsonPath &path);
+    Wrong noteValues(const RowList &rows, const QString &table, const JsonPath &path);
 
     const Job &job_;
     const JsonSource &source_;
     JobData &data_;
     UReportDoc &report_;
+    StepNotes notes_;
     const std::function<bool()> &isStopped_;
 };
 

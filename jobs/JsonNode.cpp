@@ -1,5 +1,6 @@
 #include "JsonNode.h"
 
+#include "NearestName.h"
 #include "Xlate.h"
 
 #include <QJsonArray>
@@ -95,17 +96,23 @@ bool JsonNode::expectArray() const
 
 void JsonNode::allowOnly(std::initializer_list<const char *> allowed) const
 {
+    QStringList names;
+    std::transform(allowed.begin(), allowed.end(), std::back_inserter(names),
+                   [](const char *name) { return QString::fromLatin1(name); });
+    allowOnly(names);
+}
+
+void JsonNode::allowOnly(const QStringList &allowed) const
+{
     for (const QString &key : keys()) {
-        const bool known = std::any_of(allowed.begin(), allowed.end(),
-                                       [&](const char *name) { return key == QLatin1StringView(name); });
-        if (!known) {
-            QStringList names;
-            std::transform(allowed.begin(), allowed.end(), std::back_inserter(names),
-                           [](const char *name) { return QString::fromLatin1(name); });
-            JsonPath path = path_;
-            path.emplace_back(key);
-            failAt(path, Xlate("unknown key \"%1\": %2 expected").arg(key, names.join(QStringLiteral(", "))), true);
+        if (allowed.contains(key)) {
+            continue;
         }
+        JsonPath path = path_;
+        path.emplace_back(key);
+        const QString question = didYouMean(key, allowed);
+        const QString unknown = Xlate("unknown key \"%1\": %2 expected").arg(key, allowed.join(QStringLiteral(", ")));
+        failAt(path, question.isEmpty() ? unknown : unknown + QStringLiteral("; ") + question, true);
     }
 }
 

@@ -3,15 +3,14 @@
 #include "TextFolding.h"
 #include "Xlate.h"
 
-#include <QSet>
-
 #include <algorithm>
 #include <utility>
 
 namespace kareport
 {
 
-void storeJsonObject(const JsonNode &node, const FindVariable &findVariable, UDataObject &object)
+void storeJsonObject(const JsonNode &node, const FindVariable &findVariable, UDataObject &object,
+                     const SeeMember &seeMember)
 {
     if (!node.expectObject()) {
         return;
@@ -19,6 +18,9 @@ void storeJsonObject(const JsonNode &node, const FindVariable &findVariable, UDa
     QSet<QString> names;
     for (const QString &name : node.keys()) {
         const auto parser = findVariable(name);
+        if (seeMember) {
+            seeMember(node[name], name, parser ? &*parser : nullptr);
+        }
         if (!parser) {
             continue;
         }
@@ -52,19 +54,41 @@ JsonObjectList::JsonObjectList(const JsonSource &source, const JsonPath &path, c
                                bool firstOnly, ReadProgress progress)
     : progress_(std::move(progress))
 {
+    columns_.source = source.path();
+    const SeeMember seeMember = [&](const JsonNode &member, const QString &name, const ValueParser *parser) {
+        noteMember(source, member, name, parser);
+    };
     JsonNode values(source, error_);
     for (const auto &step : path) {
         const auto *name = std::get_if<QString>(&step);
         values = name != nullptr ? values[*name] : values[std::get<qsizetype>(step)];
     }
     if (values.isObject()) {
-        storeJsonObject(values, findVariable, Add());
+        storeJsonObject(values, findVariable, Add(), seeMember);
         return;
     }
     const qsizetype count = firstOnly ? std::min<qsizetype>(values.size(), 1) : values.size();
     for (qsizetype i = 0; i < count && !error_; ++i) {
-        storeJsonObject(values[i], findVariable, Add());
+        storeJsonObject(values[i], findVariable, Add(), seeMember);
     }
+}
+
+/// Keeps the name of a member, once, where it is first met.
+void JsonObjectList::noteMember(const JsonSource &source, const JsonNode &member, const QString &name,
+                                const ValueParser *parser)
+{
+    if (names_.contains(name)) {
+        return;
+    }
+    names_.insert(name);
+    if (parser != nullptr) {
+        columns_.ids.push_back(parser->id());
+    }
+    // Finding a place reads the job from its beginning: it is done for as many as somebody may read.
+    constexpr qsizetype mostPlaces = 100;
+    const bool needsPlace = parser == nullptr && names_.size() <= mostPlaces;
+    const auto place = needsPlace ? source.errorAt(member.path(), QString(), true).place : std::nullopt;
+    columns_.columns.push_back({name, place, parser != nullptr});
 }
 
 UDataObject *JsonObjectList::GetAt(std::size_t index)

@@ -4,13 +4,21 @@
 #include "RowList.h"
 #include "ValueParser.h"
 
+#include <QSet>
+#include <QString>
+
+#include <functional>
 #include <optional>
 
 namespace kareport
 {
 
+/// Is told of every member of an object. @param parser  null when the dictionary does not know its name
+using SeeMember = std::function<void(const JsonNode &member, const QString &name, const ValueParser *parser)>;
+
 /// Stores the members of a JSON object that the dictionary knows; null stores no value. What does not fit fails the node.
-void storeJsonObject(const JsonNode &node, const FindVariable &findVariable, UDataObject &object);
+void storeJsonObject(const JsonNode &node, const FindVariable &findVariable, UDataObject &object,
+                     const SeeMember &seeMember = {});
 
 /// Rows that stand in a job: an object for a single row, or a list of objects. All of them are made at once.
 class JsonObjectList : public RowList
@@ -24,9 +32,14 @@ public:
 
     UDataObject *GetAt(std::size_t index) override;
     std::optional<InputError> error() const override { return error_; }
+    std::optional<SourceColumns> columns() const override { return columns_; }
 
 private:
+    void noteMember(const JsonSource &source, const JsonNode &member, const QString &name, const ValueParser *parser);
+
     std::optional<InputError> error_;
+    SourceColumns columns_;
+    QSet<QString> names_; ///< of the columns
     ReadProgress progress_;
 };
 

@@ -8,6 +8,7 @@
 #include <QStringList>
 
 #include <algorithm>
+#include <cstdio>
 #include <variant>
 
 namespace kareport
@@ -95,11 +96,11 @@ std::optional<QJsonValue> withValueAt(const QJsonValue &value, const QStringList
 Expected<JsonSource> JsonSource::read(const QString &path)
 {
     QFile file(path);
-    if (!file.open(QIODevice::ReadOnly)) {
+    if (path == u"-" ? !file.open(stdin, QIODevice::ReadOnly) : !file.open(QIODevice::ReadOnly)) {
         return InputError{path, std::nullopt, Xlate("the file cannot be read: %1").arg(file.errorString())};
     }
     // A pipe has no size, and may never end.
-    const qint64 size = file.size();
+    const qint64 size = path == u"-" ? 0 : file.size();
     const QByteArray bytes = size > largestJob ? QByteArray() : file.read(size > 0 ? size : largestJob + 1);
     if (std::max<qint64>(size, bytes.size()) > largestJob) {
         return InputError{path, TextPlace(),
@@ -170,6 +171,9 @@ InputError JsonSource::errorAt(const JsonPath &path, const QString &text, bool a
 {
     // What was set on the command line is not the file's fault.
     for (JsonPath given = path; !given.empty(); given.pop_back()) {
+        if (const auto option = options_.constFind(withDots(given)); option != options_.constEnd()) {
+            return {*option, std::nullopt, text};
+        }
         if (const auto set = setText(given)) {
             return {QStringLiteral("--set %1=%2").arg(withDots(given), *set), std::nullopt, text};
         }

@@ -18,7 +18,7 @@ namespace kareport
 class JsonSource
 {
 public:
-    /// Reads a file. A text that is no JSON, or whose root is no object, is an error.
+    /// Reads a file; "-" is standard input, and its file names are relative to the current folder. A text that is no JSON, or whose root is no object, is an error.
     static Expected<JsonSource> read(const QString &path);
     /// An object that stands in no file; its file names are relative to the current folder.
     static JsonSource fromObject(const QJsonObject &object);
@@ -28,6 +28,9 @@ public:
     /// and as a text where a text is expected.
     /// @return what is wrong with the key; nothing when it was set
     std::optional<QString> set(const QString &key, const QString &text);
+
+    /// Says that the value at a key, with dots as for `set`, comes from an option, so that messages name that.
+    void nameOption(const QString &key, const QString &option) { options_.insert(key, option); }
 
     /// The file; empty for what stands in none.
     const QString &path() const { return path_; }
@@ -47,6 +50,7 @@ private:
     QByteArray bytes_;
     QJsonValue root_;
     QHash<QString, QString> setTexts_; ///< by the path with dots
+    QHash<QString, QString> options_;  ///< of the command line, by the same
 };
 
 } // namespace kareport

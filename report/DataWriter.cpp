@@ -24,6 +24,19 @@ std::vector<FieldFormatter> formattersOf(const UXmlReportTable &table)
     return fields;
 }
 
+DataRemarks remarksFor(const UXmlReportTable &table)
+{
+    DataRemarks remarks;
+    remarks.columns.resize(static_cast<std::size_t>(table.GetFieldsCount()));
+    for (int i = 0; i < table.GetFieldsCount(); ++i) {
+        const sXmlReportField field = table.GetField(i);
+        ColumnRemarks &column = remarks.columns[static_cast<std::size_t>(i)];
+        column.variable = field.VariableName;
+        column.id = static_cast<quint32>(field.ID);
+    }
+    return remarks;
+}
+
 } // namespace
 
 QString withChainageLabel(QString heading, const QString &label)
@@ -71,7 +84,10 @@ void DataWriter::writeTable(const UXmlReportTable &table, UDataObjectList &list,
     if (!page_.heading().text.isEmpty()) {
         placeHeading(table, layout.writeName);
     }
-    writeRows(table, list);
+    DataRemarks unwanted;
+    DataRemarks &remarks = layout.remarks != nullptr ? *layout.remarks : unwanted;
+    remarks = remarksFor(table);
+    writeRows(table, list, remarks);
     endOutput(layout.linesAfter);
 }
 
@@ -95,7 +111,7 @@ void DataWriter::placeHeading(const UXmlReportTable &table, bool writeName)
     page_.writeHeading();
 }
 
-void DataWriter::writeRows(const UXmlReportTable &table, UDataObjectList &list)
+void DataWriter::writeRows(const UXmlReportTable &table, UDataObjectList &list, DataRemarks &remarks)
 {
     const std::vector<FieldFormatter> fields = formattersOf(table);
     const quint64 losses = page_.losses();
@@ -103,10 +119,11 @@ void DataWriter::writeRows(const UXmlReportTable &table, UDataObjectList &list)
     // With a row missing, those after it are of no use either.
     for (std::size_t index = 1; object != nullptr && page_.losses() == losses; ++index) {
         // The row is complete before the next object is asked for: a list may hold one object at a time.
-        formatRow(fields, *object);
+        formatRow(fields, *object, index - 1, remarks);
         object = list.GetAt(index);
         if (object != nullptr) {
             page_.writeLine(row_.view(), 0, 1, 0);
+            remarks.setLine(page_.lineCount());
             continue;
         }
         // The last line end may turn the page: without a heading it does not begin with one over no rows.
@@ -115,15 +132,19 @@ void DataWriter::writeRows(const UXmlReportTable &table, UDataObjectList &list)
         page_.noteChange();
         page_.setHeading(noHeading);
         page_.writeLine(QStringView(), 0, 1, 0);
+        remarks.setLine(page_.lineCount());
     }
 }
 
-void DataWriter::formatRow(const std::vector<FieldFormatter> &fields, const UDataObject &object)
+void DataWriter::formatRow(const std::vector<FieldFormatter> &fields, const UDataObject &object, quint64 row,
+                           DataRemarks &remarks)
 {
     endWideVectors();
     row_.clear();
     QStringView suffix;
+    auto column = remarks.columns.begin();
     for (const FieldFormatter &field : fields) {
+        ColumnRemarks &about = *column++;
         switch (field.marker()) {
         case FieldMarker::SuffixR: suffix = u"R"; continue;
         case FieldMarker::SuffixPlus: suffix = u"+"; continue;
@@ -131,9 +152,14 @@ void DataWriter::formatRow(const std::vector<FieldFormatter> &fields, const UDat
         case FieldMarker::None: {
             const UDictEntry *entry = object.Find(field.id());
             if (entry != nullptr) {
-                field.append(row_, options_, entry->kind(), entry->GetData(), suffix);
+                if (!field.append(row_, options_, entry->kind(), entry->GetData(), suffix)) {
+                    remarks.add(about.tooWide, row);
+                }
             } else {
                 field.append(row_, options_, ValueKind::None, nullptr, suffix);
+                if (field.showsZeroForNone(options_)) {
+                    remarks.add(about.missing, row);
+                }
             }
             row_.append(options_.separator);
             break;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "DataRemarks.h"
 #include "FieldFormatter.h"
 #include "PageWriter.h"
 #include "UDataObjectList.h"
@@ -25,14 +26,16 @@ public:
         int linesAfter = 0;
         int headingLinesAfter = -1; ///< -1 for the usual 2
         QString chainageLabel;
-        bool writeName = false; ///< the table's name over its heading
+        bool writeName = false;         ///< the table's name over its heading
+        DataRemarks *remarks = nullptr; ///< receives what the table does not show as it is
     };
     void writeTable(const UXmlReportTable &table, UDataObjectList &list, const TableLayout &layout);
 
 private:
     void placeHeading(const UXmlReportTable &table, bool writeName);
-    void writeRows(const UXmlReportTable &table, UDataObjectList &list);
-    void formatRow(const std::vector<FieldFormatter> &fields, const UDataObject &object);
+    void writeRows(const UXmlReportTable &table, UDataObjectList &list, DataRemarks &remarks);
+    void formatRow(const std::vector<FieldFormatter> &fields, const UDataObject &object, quint64 row,
+                   DataRemarks &remarks);
     void endOutput(int linesAfter);
 
     PageWriter &page_;

@@ -10,6 +10,8 @@
 namespace kareport
 {
 
+struct DataRemarks;
+
 /// What a report takes from around it: from the application, the printer, the user's preferences and the clock, unless
 /// whoever makes the report says otherwise (`UReportDoc::SetSurroundings`).
 struct ReportSurroundings
@@ -21,6 +23,7 @@ struct ReportSurroundings
     QMargins margins = defaultMargins;   ///< hundredths of a millimetre
     unsigned fontSize = defaultFontSize; ///< points
     bool printHash = false;              ///< whether a value wider than its column prints as "#"
+    DataRemarks *remarks = nullptr;      ///< receives what the table written last does not show as it is; may be null
 };
 
 } // namespace kareport

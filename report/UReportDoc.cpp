@@ -79,6 +79,7 @@ void UReportDoc::SetSurroundings(const std::optional<kareport::ReportSurrounding
 {
     parts_->surroundings = surroundings;
     parts_->data.ownPrintHash = surroundings ? std::optional(surroundings->printHash) : std::nullopt;
+    parts_->data.remarks = surroundings ? surroundings->remarks : nullptr;
     if (surroundings) {
         parts_->layout.margins = surroundings->margins;
         parts_->layout.fontSize = surroundings->fontSize;

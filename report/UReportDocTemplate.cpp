@@ -102,7 +102,8 @@ bool UReportDoc::WriteDataTable(UDataObjectList *list, int linesBefore, int line
         const kareport::FormatOptions options = parts_->data.formatOptions();
         kareport::DataWriter(parts_->page, options)
             .writeTable(*table, *list,
-                        {linesBefore, linesAfter, headingLinesAfter, parts_->chainageLabel, parts_->writeTableName});
+                        {linesBefore, linesAfter, headingLinesAfter, parts_->chainageLabel, parts_->writeTableName,
+                         parts_->data.remarks});
     });
 }
 

@@ -69,12 +69,12 @@ FieldFormatter::FieldFormatter(const sXmlReportField &field)
       id_(static_cast<quint32>(field.ID))
 {}
 
-void FieldFormatter::append(TextBuffer &out, const FormatOptions &options, ValueKind kind, const void *value,
+bool FieldFormatter::append(TextBuffer &out, const FormatOptions &options, ValueKind kind, const void *value,
                             QStringView suffix) const
 {
     if (marker_ == FieldMarker::Filler) {
         out.appendFill(columnOf(width_), u' ');
-        return;
+        return true;
     }
     Input input(kind, value);
     if (kind == ValueKind::Double && std::isfinite(input.number)) {
@@ -82,11 +82,34 @@ void FieldFormatter::append(TextBuffer &out, const FormatOptions &options, Value
     }
     const std::size_t start = out.size();
     appendValue(out, options, input, suffix);
-    if (options.printHash && out.size() - start > columnOf(width_)) {
+    const std::size_t length = out.size() - start;
+    if (options.printHash && length > columnOf(width_)) {
         out.truncate(start);
         out.appendFill(columnOf(width_), u'#');
     }
     fit(out, start, options.separator);
+    return length <= columnOf(width_) || width_ <= 0 || options.separator == u'\t';
+}
+
+bool FieldFormatter::showsZeroForNone(const FormatOptions &options) const
+{
+    switch (type_) {
+    case VARIABLE_INTEGER:
+    case VARIABLE_DOUBLE:
+    case VARIABLE_AREA:
+    case VARIABLE_ANGLE:
+    case VARIABLE_VANGLE:
+    case VARIABLE_BEARING:
+    case VARIABLE_COORDINATE:
+    case VARIABLE_LENGTH:
+    case VARIABLE_DISTANCE:
+    case VARIABLE_ELEVATION: return !options.zeroBlank;
+    case VARIABLE_STATION:
+    case VARIABLE_OFFSET:
+    case VARIABLE_PLAIN:
+    case VARIABLE_THICKNESS: return true;
+    default: return false;
+    }
 }
 
 void FieldFormatter::appendValue(TextBuffer &out, const FormatOptions &options, const Input &input,

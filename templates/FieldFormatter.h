@@ -28,11 +28,14 @@ public:
 
     FieldMarker marker() const { return marker_; }
     quint32 id() const { return id_; }
+    /// Whether a value that is missing shows as a number 0.
+    bool showsZeroForNone(const FormatOptions &options) const;
 
     /// Appends a value's text, fitted to the field's column.
     /// @param kind    what `value` points to; `None` and any other number count as 0, false or an empty text
     /// @param suffix  "+" shows an offset with its sign, anything else with "L" or "R" after it
-    void append(TextBuffer &out, const FormatOptions &options, ValueKind kind, const void *value,
+    /// @return whether the text fits the column; one without a width, or in the spreadsheet form, has room for any
+    bool append(TextBuffer &out, const FormatOptions &options, ValueKind kind, const void *value,
                 QStringView suffix) const;
 
 private:

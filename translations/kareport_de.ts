@@ -9,6 +9,11 @@
         <translation>Die Verknüpfung „%1“ gehört einem anderen Benutzer und steht in einem Ordner, in den jeder schreiben kann</translation>
     </message>
     <message>
+        <location filename="../host/app/NearestName.cpp"/>
+        <source>did you mean "%1"?</source>
+        <translation>meinten Sie "%1"?</translation>
+    </message>
+    <message>
         <location filename="../host/app/ReplaceFile.cpp"/>
         <source>not all of it could be written</source>
         <translation>nicht alles konnte geschrieben werden</translation>
@@ -851,6 +856,36 @@
         <translation>in</translation>
     </message>
     <message>
+        <location filename="../sources/ColumnBinding.cpp"/>
+        <source>one of %1 was expected</source>
+        <translation>einer dieser Werte wurde erwartet: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/ColumnBinding.cpp"/>
+        <source>there is no column %1: one of 1 to %2 was expected</source>
+        <translation>es gibt keine Spalte %1: erwartet wurde eine von 1 bis %2</translation>
+    </message>
+    <message>
+        <location filename="../sources/ColumnBinding.cpp"/>
+        <source>there is no column "%1"</source>
+        <translation>es gibt keine Spalte "%1"</translation>
+    </message>
+    <message>
+        <location filename="../sources/ColumnBinding.cpp"/>
+        <source>the columns %1 and %2 are both named "%3": each variable was expected once</source>
+        <translation>die Spalten %1 und %2 heißen beide „%3“: jede Variable wurde nur einmal erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/ColumnBinding.cpp"/>
+        <source>the dictionary has no variable "%1"</source>
+        <translation>das Wörterbuch hat keine Variable "%1"</translation>
+    </message>
+    <message>
+        <location filename="../sources/ColumnBinding.cpp"/>
+        <source>the variable "%1" has two columns: each variable was expected once</source>
+        <translation>die Variable "%1" hat zwei Spalten: jede Variable wurde einmal erwartet</translation>
+    </message>
+    <message>
         <location filename="../sources/FileBytesPosix.cpp"/>
         <source>the file was cut short while it was read</source>
         <translation>die Datei wurde beim Lesen abgeschnitten</translation>
@@ -861,9 +896,74 @@
         <translation>mehr als %1 MB kommen aus einer Quelle, die keine Datei ist</translation>
     </message>
     <message>
+        <location filename="../sources/GeometryColumns.cpp"/>
+        <source>the value "%1" of the column "%2" does not fit: %3 was expected</source>
+        <translation>der Wert "%1" der Spalte "%2" passt nicht: %3 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/PointGeometry.cpp"/>
+        <source>bytes that are no geometry</source>
+        <translation>Bytes, die keine Geometrie sind</translation>
+    </message>
+    <message>
+        <location filename="../sources/PointGeometry.cpp"/>
+        <source>a line string</source>
+        <translation>ein Linienzug</translation>
+    </message>
+    <message>
+        <location filename="../sources/PointGeometry.cpp"/>
+        <source>a polygon</source>
+        <translation>ein Polygon</translation>
+    </message>
+    <message>
+        <location filename="../sources/PointGeometry.cpp"/>
+        <source>several points</source>
+        <translation>mehrere Punkte</translation>
+    </message>
+    <message>
+        <location filename="../sources/PointGeometry.cpp"/>
+        <source>several line strings</source>
+        <translation>mehrere Linienzüge</translation>
+    </message>
+    <message>
+        <location filename="../sources/PointGeometry.cpp"/>
+        <source>several polygons</source>
+        <translation>mehrere Polygone</translation>
+    </message>
+    <message>
+        <location filename="../sources/PointGeometry.cpp"/>
+        <source>a collection of geometries</source>
+        <translation>eine Sammlung von Geometrien</translation>
+    </message>
+    <message>
+        <location filename="../sources/PointGeometry.cpp"/>
+        <source>a geometry of another kind</source>
+        <translation>eine Geometrie anderer Art</translation>
+    </message>
+    <message>
         <location filename="../sources/RowBatches.cpp"/>
         <source>there is not enough memory for the data</source>
         <translation>der Arbeitsspeicher reicht für die Daten nicht aus</translation>
+    </message>
+    <message>
+        <location filename="../sources/SpooledBytes.cpp"/>
+        <source>the data cannot be kept in a temporary file: %1</source>
+        <translation>die Daten können nicht in einer temporären Datei gehalten werden: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/TextEncoding.cpp"/>
+        <source>the file is not UTF-16</source>
+        <translation>die Datei ist nicht UTF-16</translation>
+    </message>
+    <message>
+        <location filename="../sources/TextEncoding.cpp"/>
+        <source>the file is not Windows-1252: it has a byte that is no character there</source>
+        <translation>die Datei ist nicht Windows-1252: sie hat ein Byte, das dort kein Zeichen ist</translation>
+    </message>
+    <message>
+        <location filename="../sources/TextEncoding.cpp"/>
+        <source>the file has no byte-order mark: UTF-16 with its mark was expected</source>
+        <translation>die Datei hat keine Bytereihenfolge-Marke: UTF-16 mit seiner Marke wurde erwartet</translation>
     </message>
     <message>
         <location filename="../sources/ValueParser.cpp"/>
@@ -887,38 +987,38 @@
     </message>
     <message>
         <location filename="../sources/ValueParser.cpp"/>
+        <source>a number, or an offset such as 12.5R</source>
+        <translation>eine Zahl oder ein Abstand wie 12.5R</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
+        <source>a number, or ByLayer</source>
+        <translation>eine Zahl oder ByLayer</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
+        <source>a number, or an angle such as 45°30'15"</source>
+        <translation>eine Zahl oder ein Winkel wie 45°30'15"</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
+        <source>a number, or a bearing such as N45-30-15E</source>
+        <translation>eine Zahl oder eine Richtung wie N45-30-15E</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
         <source>an angle such as 45-30-15</source>
         <translation>ein Winkel wie 45-30-15</translation>
     </message>
     <message>
         <location filename="../sources/ValueParser.cpp"/>
+        <source>a bearing such as 45-30-15 or N45-30-15E</source>
+        <translation>eine Richtung wie 45-30-15 oder N45-30-15E</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
         <source>a number</source>
         <translation>eine Zahl</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvObjectList.cpp"/>
-        <source>a header row of variable names was expected</source>
-        <translation>eine Kopfzeile mit Variablennamen wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvObjectList.cpp"/>
-        <source>the columns %1 and %2 are both named "%3": each variable was expected once</source>
-        <translation>die Spalten %1 und %2 heißen beide „%3“: jede Variable wurde nur einmal erwartet</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvObjectList.cpp"/>
-        <source>no column of the header row is a variable of the dictionary: a header row of variable names, with the data's delimiter between them, was expected</source>
-        <translation>keine Spalte der Kopfzeile ist eine Variable des Wörterbuchs: eine Kopfzeile mit Variablennamen, dazwischen das Trennzeichen der Daten, wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvObjectList.cpp"/>
-        <source>the row has %1 cells: %2 were expected, as in the header row</source>
-        <translation>die Zeile hat %1 Zellen: wie in der Kopfzeile wurden %2 erwartet</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvObjectList.cpp"/>
-        <source>the cell "%1" of the column "%2" does not fit: %3 was expected</source>
-        <translation>die Zelle „%1“ der Spalte „%2“ passt nicht: %3 wurde erwartet</translation>
     </message>
     <message>
         <location filename="../sources/csv/CsvReader.cpp"/>
@@ -927,7 +1027,7 @@
     </message>
     <message>
         <location filename="../sources/csv/CsvReader.cpp"/>
-        <source>a delimiter was expected behind the closing quote</source>
+        <source>a delimiter was expected after the closing quote</source>
         <translation>hinter dem schließenden Anführungszeichen wurde ein Trennzeichen erwartet</translation>
     </message>
     <message>
@@ -954,6 +1054,157 @@
         <location filename="../sources/csv/CsvReader.cpp"/>
         <source>the row is longer than %1 bytes: a table of rows was expected</source>
         <translation>die Zeile ist länger als %1 Byte: eine Tabelle aus Zeilen wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRows.cpp"/>
+        <source>"%1" is no order of columns: each of the letters P, N, E, Z and D at most once, and - for a column that is passed over, was expected, such as PNEZD</source>
+        <translation>"%1" ist keine Reihenfolge von Spalten: erwartet wurden die Buchstaben P, N, E, Z und D je höchstens einmal, und - für eine Spalte, die übergangen wird, wie PNEZD</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRows.cpp"/>
+        <source>a header row of variable names was expected</source>
+        <translation>eine Kopfzeile mit Variablennamen wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRows.cpp"/>
+        <source>a header row was expected</source>
+        <translation>eine Kopfzeile wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRows.cpp"/>
+        <source>no column of the header row is a variable of the dictionary: a header row of variable names, with the data's delimiter between them, was expected</source>
+        <translation>keine Spalte der Kopfzeile ist eine Variable des Wörterbuchs: eine Kopfzeile mit Variablennamen, dazwischen das Trennzeichen der Daten, wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRows.cpp"/>
+        <source>no column is a variable of the dictionary: without a header row, columns with their numbers were expected, or an order such as PNEZD</source>
+        <translation>keine Spalte ist eine Variable des Wörterbuchs: ohne Kopfzeile wurden Spalten mit ihren Nummern erwartet oder eine Reihenfolge wie PNEZD</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRows.cpp"/>
+        <source>the row has %1 cells: %2 were expected, as in the header row</source>
+        <translation>die Zeile hat %1 Zellen: wie in der Kopfzeile wurden %2 erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRows.cpp"/>
+        <source>the row has %1 cells: %2 were expected, as in all rows</source>
+        <translation>die Zeile hat %1 Zellen: %2 wurden erwartet, wie in allen Zeilen</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRows.cpp"/>
+        <source>the cell "%1" of the column "%2" does not fit: %3 was expected</source>
+        <translation>die Zelle „%1“ der Spalte „%2“ passt nicht: %3 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/DelimiterGuess.cpp"/>
+        <source>blanks and tabs</source>
+        <translation>Leerzeichen und Tabulatoren</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/DelimiterGuess.cpp"/>
+        <source>the comma</source>
+        <translation>das Komma</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/DelimiterGuess.cpp"/>
+        <source>the semicolon</source>
+        <translation>das Semikolon</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/DelimiterGuess.cpp"/>
+        <source>the tab</source>
+        <translation>der Tabulator</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/DelimiterGuess.cpp"/>
+        <source>the vertical bar</source>
+        <translation>der senkrechte Strich</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/DelimiterGuess.cpp"/>
+        <source>the delimiter cannot be found out: with a comma, a semicolon, a tab, a vertical bar, or blanks and tabs, the first rows do not have the same number of cells that fit their variables. The delimiter itself was expected</source>
+        <translation>das Trennzeichen ist nicht zu ermitteln: mit Komma, Semikolon, Tabulator, senkrechtem Strich oder Leerzeichen und Tabulatoren haben die ersten Zeilen nicht gleich viele Zellen, die zu ihren Variablen passen. Das Trennzeichen selbst wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/DelimiterGuess.cpp"/>
+        <source>the delimiter cannot be found out: it may be %1. The delimiter itself was expected</source>
+        <translation>das Trennzeichen ist nicht zu ermitteln: möglich sind %1. Das Trennzeichen selbst wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/DelimiterGuess.cpp"/>
+        <source> or </source>
+        <comment>between two delimiters</comment>
+        <translation> oder </translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>a list of objects, or an object a line, was expected</source>
+        <translation>eine Liste von Objekten oder ein Objekt je Zeile wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>a comma or the end of the list was expected</source>
+        <translation>ein Komma oder das Ende der Liste wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>the end of the line was expected: each object stands in a line of its own</source>
+        <translation>das Ende der Zeile wurde erwartet: jedes Objekt steht in einer eigenen Zeile</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>an object was expected</source>
+        <translation>ein Objekt wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>nothing was expected after the list</source>
+        <translation>hinter der Liste wurde nichts erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>the object is longer than %1 bytes: a list of rows was expected</source>
+        <translation>das Objekt ist länger als %1 Bytes: eine Liste von Zeilen wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>the key "%1" stands twice in an object</source>
+        <translation>der Schlüssel "%1" steht zweimal in einem Objekt</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>the variable "%1" stands twice: each variable was expected once</source>
+        <translation>die Variable „%1“ kommt zweimal vor: jede Variable wurde nur einmal erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>this is no JSON: %1</source>
+        <translation>das ist kein JSON: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>the value of "%1" does not fit: %2 was expected</source>
+        <translation>der Wert von „%1“ passt nicht: %2 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonKeys.cpp"/>
+        <source>the columns of JSON have no numbers: the name of a key was expected</source>
+        <translation>die Spalten von JSON haben keine Nummern: der Name eines Schlüssels wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonKeys.cpp"/>
+        <source>no object has the key "%1"</source>
+        <translation>kein Objekt hat den Schlüssel "%1"</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonKeys.cpp"/>
+        <source>no key of the objects is a variable of the dictionary: there are %1</source>
+        <translation>kein Schlüssel der Objekte ist eine Variable des Wörterbuchs: vorhanden sind %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonKeys.cpp"/>
+        <source>none</source>
+        <translation>keine</translation>
     </message>
     <message>
         <location filename="../sources/landxml/AlignmentRows.cpp"/>
@@ -1266,12 +1517,192 @@
         <translation>die Elemente sind tiefer als %1 ineinander geschachtelt</translation>
     </message>
     <message>
-        <location filename="../jobs/JobData.cpp"/>
+        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
+        <source>(character %1 of the query)</source>
+        <translation>(Zeichen %1 der Abfrage)</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
+        <source>this is no connection: %1. Words such as service=survey, host=..., port=..., dbname=... and user=... were expected</source>
+        <translation>das ist keine Verbindung: %1. Erwartet wurden Angaben wie service=survey, host=..., port=..., dbname=... und user=...</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
+        <source>a connection has no "%1": a password is read from the user's own password file (~/.pgpass) or from PGPASSWORD</source>
+        <translation>eine Verbindung hat kein "%1": ein Passwort wird aus der eigenen Passwortdatei des Benutzers (~/.pgpass) oder aus PGPASSWORD gelesen</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
+        <source>the server does not answer</source>
+        <translation>der Server antwortet nicht</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
+        <source>the server wants a password: it was expected in the user's own password file (~/.pgpass) or in PGPASSWORD</source>
+        <translation>der Server verlangt ein Passwort: es wurde in der eigenen Passwortdatei des Benutzers (~/.pgpass) oder in PGPASSWORD erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
+        <source>the server cannot be connected to: %1</source>
+        <translation>mit dem Server kann keine Verbindung hergestellt werden: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
+        <source>the connection to the server is lost: %1</source>
+        <translation>die Verbindung zum Server ist verloren: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
+        <source>the database does not answer the query: %1</source>
+        <translation>die Datenbank beantwortet die Abfrage nicht: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresRows.cpp"/>
+        <source>the query has %1 parameters: values of %2 are given</source>
+        <translation>die Abfrage hat %1 Parameter: Werte von %2 sind angegeben</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresRows.cpp"/>
+        <source>the query is not a single SELECT, which was expected</source>
+        <translation>die Abfrage ist kein einzelnes SELECT, wie es erwartet wurde</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresRows.cpp"/>
+        <source>the columns "%1" and "%2" both have geometries: a query with one of them was expected</source>
+        <translation>die Spalten "%1" und "%2" haben beide Geometrien: eine Abfrage mit einer davon wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresRows.cpp"/>
+        <source>no column is a variable of the dictionary: there are %1</source>
+        <translation>keine Spalte ist eine Variable des Wörterbuchs: vorhanden sind %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresRows.cpp"/>
+        <source>there is %1: a point was expected</source>
+        <translation>es steht dort %1: ein Punkt wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresRows.cpp"/>
+        <source>row %1: </source>
+        <translation>Zeile %1: </translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>a database was expected, which is a file</source>
+        <translation>eine Datenbank wurde erwartet, also eine Datei</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>the query has parameters: values were expected in their places</source>
+        <translation>die Abfrage hat Parameter: an ihrer Stelle wurden Werte erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>the database is locked: another program writes to it</source>
+        <translation>die Datenbank ist gesperrt: ein anderes Programm schreibt hinein</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>the file is no SQLite database, or it is encrypted</source>
+        <translation>die Datei ist keine SQLite-Datenbank, oder sie ist verschlüsselt</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>the database is broken: %1</source>
+        <translation>die Datenbank ist beschädigt: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>a program that wrote to the database has not ended its work: it was expected to be opened by that program first</source>
+        <translation>ein Programm, das in die Datenbank schrieb, hat seine Arbeit nicht beendet: erwartet wurde, dass dieses Programm sie zuerst öffnet</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>the database cannot be opened: %1</source>
+        <translation>die Datenbank kann nicht geöffnet werden: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>the database cannot be read: %1</source>
+        <translation>die Datenbank kann nicht gelesen werden: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>reading was stopped</source>
+        <translation>das Lesen wurde abgebrochen</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>the database was changed while it was read, by a program that does not use SQLite</source>
+        <translation>die Datenbank wurde beim Lesen verändert, von einem Programm, das nicht SQLite verwendet</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteRows.cpp"/>
+        <source>the database has no table "%1"</source>
+        <translation>die Datenbank hat keine Tabelle "%1"</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteRows.cpp"/>
+        <source>%1 bytes</source>
+        <translation>%1 Bytes</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ColumnChoices.cpp"/>
+        <source>the name of a column, or its number from 1, was expected</source>
+        <translation>der Name einer Spalte oder ihre Nummer ab 1 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ColumnNotes.cpp"/>
+        <source>the column "%1" is no variable of the dictionary "%2"</source>
+        <translation>die Spalte „%1“ ist keine Variable des Wörterbuchs „%2“</translation>
+    </message>
+    <message>
+        <location filename="../jobs/CsvData.cpp"/>
+        <source>a row was expected after the header row: a block shows the first one</source>
+        <translation>nach der Kopfzeile wurde eine Zeile erwartet: ein Block zeigt die erste</translation>
+    </message>
+    <message>
+        <location filename="../jobs/CsvData.cpp"/>
+        <source>a row was expected: a block shows the first one</source>
+        <translation>eine Zeile wurde erwartet: ein Block zeigt die erste</translation>
+    </message>
+    <message>
+        <location filename="../jobs/CsvOptions.cpp"/>
+        <source>the names of the columns in their order were expected</source>
+        <translation>die Namen der Spalten in ihrer Reihenfolge wurden erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/CsvOptions.cpp"/>
+        <source>one character that is neither a digit, a letter nor a sign, and not the decimal sign, was expected</source>
+        <translation>ein Zeichen, das weder Ziffer, Buchstabe noch Vorzeichen und nicht das Dezimalzeichen ist, wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/CsvOptions.cpp"/>
+        <source>a text of one ASCII character that is neither a quote nor a line end, or one of %1, was expected</source>
+        <translation>ein Text aus einem ASCII-Zeichen, das weder Anführungszeichen noch Zeilenende ist, oder eines von %1 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/CsvOptions.cpp"/>
+        <source>an order of columns such as PNEZD was expected: each of the letters P, N, E, Z and D at most once, and - for a column that is passed over</source>
+        <translation>eine Reihenfolge von Spalten wie PNEZD wurde erwartet: die Buchstaben P, N, E, Z und D je höchstens einmal, und - für eine Spalte, die übergangen wird</translation>
+    </message>
+    <message>
+        <location filename="../jobs/CsvOptions.cpp"/>
+        <source>the columns have names already: either an order or a list of columns was expected</source>
+        <translation>die Spalten haben schon Namen: entweder eine Reihenfolge oder eine Liste von Spalten wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/CsvOptions.cpp"/>
+        <source>a text of one ASCII character that is neither a quote nor a line end was expected</source>
+        <translation>ein Text aus einem ASCII-Zeichen, das weder Anführungszeichen noch Zeilenende ist, wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/DataFiles.cpp"/>
         <source>the data file "%1" cannot be read: %2</source>
         <translation>die Datendatei „%1“ kann nicht gelesen werden: %2</translation>
     </message>
     <message>
-        <location filename="../jobs/JobData.cpp"/>
+        <location filename="../jobs/DataKind.cpp"/>
         <source>Reading %1</source>
         <translation>%1 wird gelesen</translation>
     </message>
@@ -1281,9 +1712,24 @@
         <translation>der Datenbestand „%1“ hat keine Zeile: ein Block zeigt die erste</translation>
     </message>
     <message>
-        <location filename="../jobs/JobData.cpp"/>
-        <source>a row was expected behind the header row: a block shows the first one</source>
-        <translation>hinter der Kopfzeile wurde eine Zeile erwartet: ein Block zeigt die erste</translation>
+        <location filename="../jobs/JobDataReader.cpp"/>
+        <source>one of the keys %1 was expected</source>
+        <translation>einer der Schlüssel %1 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobDataReader.cpp"/>
+        <source>only one of the keys %1 was expected</source>
+        <translation>nur einer der Schlüssel %1 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobDataReader.cpp"/>
+        <source>standard input is the job itself: a file was expected</source>
+        <translation>die Standardeingabe ist der Auftrag selbst: eine Datei wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobFileName.cpp"/>
+        <source>a file name without a character 0 was expected</source>
+        <translation>ein Dateiname ohne das Zeichen 0 wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/JobFiles.cpp"/>
@@ -1342,11 +1788,6 @@
     </message>
     <message>
         <location filename="../jobs/JobReader.cpp"/>
-        <source>one of %1 was expected</source>
-        <translation>einer dieser Werte wurde erwartet: %1</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
         <source>a list of four margins (left, top, right, bottom) was expected</source>
         <translation>eine Liste von vier Seitenrändern (links, oben, rechts, unten) wurde erwartet</translation>
     </message>
@@ -1354,26 +1795,6 @@
         <location filename="../jobs/JobReader.cpp"/>
         <source>a character code or a text of one character was expected</source>
         <translation>ein Zeichencode oder ein Text aus einem Zeichen wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>a file name without a character 0 was expected</source>
-        <translation>ein Dateiname ohne das Zeichen 0 wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>either "csv" or "values" was expected</source>
-        <translation>entweder "csv" oder "values" wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>an object or a list of objects was expected</source>
-        <translation>ein Objekt oder eine Liste von Objekten wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>a text of one ASCII character that is neither a quote nor a line end was expected</source>
-        <translation>ein Text aus einem ASCII-Zeichen, das weder Anführungszeichen noch Zeilenende ist, wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/JobReader.cpp"/>
@@ -1437,11 +1858,6 @@
     </message>
     <message>
         <location filename="../jobs/JobSteps.cpp"/>
-        <source>none</source>
-        <translation>keine</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobSteps.cpp"/>
         <source>the %1 "%2" cannot be written: the template has no dictionary named "%3"</source>
         <translation>%1 „%2“ kann nicht geschrieben werden: die Vorlage hat kein Wörterbuch namens „%3“</translation>
     </message>
@@ -1449,6 +1865,31 @@
         <location filename="../jobs/JobSteps.cpp"/>
         <source>the %1 "%2" cannot be written: the format of its field "%3" is beyond %4 characters</source>
         <translation>%1 „%2“ kann nicht geschrieben werden: das Format des Felds „%3“ geht über %4 Zeichen hinaus</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>no column fills the field "%1" of the %2 "%3"</source>
+        <translation>keine Spalte füllt das Feld „%1“ (%2 „%3“)</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>the data "%1" does not say the unit of its numbers: %2 was taken</source>
+        <translation>die Daten „%1“ sagen die Einheit ihrer Zahlen nicht: %2 wurde angenommen</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>%1 values are wider than the field "%2" of the table "%3" and show as #, the first one in row %4, line %5 of the report</source>
+        <translation>%1 Werte sind breiter als das Feld „%2“ der Tabelle „%3“ und erscheinen als #, der erste in Reihe %4, Zeile %5 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>%1 values are wider than the field "%2" of the table "%3", the first one in row %4, line %5 of the report</source>
+        <translation>%1 Werte sind breiter als das Feld „%2“ der Tabelle „%3“, der erste in Reihe %4, Zeile %5 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>%1 values of the field "%2" of the table "%3" are missing and show as 0, the first one in row %4, line %5 of the report</source>
+        <translation>%1 Werte des Felds „%2“ der Tabelle „%3“ fehlen und erscheinen als 0, der erste in Reihe %4, Zeile %5 des Berichts</translation>
     </message>
     <message>
         <location filename="../jobs/JobStepsReader.cpp"/>
@@ -1497,11 +1938,6 @@
     </message>
     <message>
         <location filename="../jobs/JsonNode.cpp"/>
-        <source>an object was expected</source>
-        <translation>ein Objekt wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JsonNode.cpp"/>
         <source>a list was expected</source>
         <translation>eine Liste wurde erwartet</translation>
     </message>
@@ -1509,16 +1945,6 @@
         <location filename="../jobs/JsonNode.cpp"/>
         <source>unknown key "%1": %2 expected</source>
         <translation>unbekannter Schlüssel "%1": erwartet: %2</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JsonObjectList.cpp"/>
-        <source>the variable "%1" stands twice: each variable was expected once</source>
-        <translation>die Variable „%1“ kommt zweimal vor: jede Variable wurde nur einmal erwartet</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JsonObjectList.cpp"/>
-        <source>the value of "%1" does not fit: %2 was expected</source>
-        <translation>der Wert von „%1“ passt nicht: %2 wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/JsonSource.cpp"/>
@@ -1561,6 +1987,11 @@
         <translation>für den Schlüssel "%1" ist im Auftrag kein Platz</translation>
     </message>
     <message>
+        <location filename="../jobs/PostgresData.cpp"/>
+        <source>a text, a number, true, false or null was expected</source>
+        <translation>ein Text, eine Zahl, true, false oder null wurde erwartet</translation>
+    </message>
+    <message>
         <location filename="../jobs/SavedText.cpp"/>
         <source>a saved report was expected; this is a PDF</source>
         <translation>ein gespeicherter Bericht wurde erwartet; dies ist eine PDF-Datei</translation>
@@ -1569,6 +2000,16 @@
         <location filename="../jobs/SavedText.cpp"/>
         <source>a report file was expected; this is no UTF-8</source>
         <translation>eine Berichtsdatei wurde erwartet; dies ist kein UTF-8-Text</translation>
+    </message>
+    <message>
+        <location filename="../jobs/SqliteData.cpp"/>
+        <source>there is no database "%1"</source>
+        <translation>es gibt keine Datenbank „%1“</translation>
+    </message>
+    <message>
+        <location filename="../jobs/SqliteData.cpp"/>
+        <source>either "table" or "query" was expected</source>
+        <translation>entweder "table" oder "query" wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/TemplateSource.cpp"/>
@@ -1611,6 +2052,11 @@
         <translation>es gibt keine Vorlage namens „%1“; vorhanden: %2</translation>
     </message>
     <message>
+        <location filename="../jobs/ValuesData.cpp"/>
+        <source>an object or a list of objects was expected</source>
+        <translation>ein Objekt oder eine Liste von Objekten wurde erwartet</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/CommandLineJob.cpp"/>
         <source>kareport: the report will have at least %1</source>
         <translation>kareport: der Bericht wird mindestens %1 haben</translation>
@@ -1624,6 +2070,11 @@
         <location filename="../apps/kareport/CommandLineJob.cpp"/>
         <source>kareport: stopped; nothing was written</source>
         <translation>kareport: abgebrochen; es wurde nichts geschrieben</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineJob.cpp"/>
+        <source>kareport: "%1" could not be written: %2</source>
+        <translation>kareport: „%1“ konnte nicht geschrieben werden: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CommandOutputs.cpp"/>
@@ -1679,6 +2130,16 @@
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>--set: %1</source>
         <translation>--set: %1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/DataOptions.cpp"/>
+        <source>--units "%1": QUANTITY=UNIT was expected, as in length=usft</source>
+        <translation>--units "%1": GRÖSSE=EINHEIT wurde erwartet, wie in length=usft</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/DataOptions.cpp"/>
+        <source>--columns "%1": the names of the columns in their order, or VARIABLE=COLUMN for each, were expected</source>
+        <translation>--columns "%1": die Namen der Spalten in ihrer Reihenfolge oder VARIABLE=SPALTE für jede wurden erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>
@@ -1737,6 +2198,11 @@
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
+        <source>standard input is the list of jobs: no job is read from it</source>
+        <translation>die Standardeingabe ist die Liste der Aufträge: kein Auftrag wird von dort gelesen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderCommand.cpp"/>
         <source>--slice takes a part of several job files: these were expected</source>
         <translation>--slice nimmt einen Teil mehrerer Auftragsdateien: diese wurden erwartet</translation>
     </message>
@@ -1749,6 +2215,16 @@
         <location filename="../apps/kareport/RenderCommand.cpp"/>
         <source>-o "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
         <translation>-o "%1" ist eine Datei für mehrere Aufträge: ein Name mit {} wurde erwartet; {} steht für den Namen der Auftragsdatei</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderCommand.cpp"/>
+        <source>--notes "%1": the name of a file was expected</source>
+        <translation>--notes "%1": der Name einer Datei wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderCommand.cpp"/>
+        <source>--notes "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
+        <translation>--notes "%1" ist eine Datei für mehrere Aufträge: ein Name mit {} wurde erwartet, was für den Namen der Auftragsdatei steht</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
@@ -1786,6 +2262,15 @@
 
 %2</source>
         <translation>„%1“ wurde geöffnet, aber nicht alles daraus wird angezeigt:
+
+%2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
+        <source>The report was made. Notes on its data: %1
+
+%2</source>
+        <translation>Der Bericht wurde erstellt. Hinweise zu seinen Daten: %1
 
 %2</translation>
     </message>
@@ -2008,6 +2493,11 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>It gets reports as plain text.</source>
         <translation>Es erhält Berichte als reinen Text.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
+        <source>a window has no standard input: a file was expected</source>
+        <translation>ein Fenster hat keine Standardeingabe: eine Datei wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>

@@ -9,6 +9,11 @@
         <translation>リンク "%1" は別のユーザーのもので、だれでも書き込めるフォルダーにあります</translation>
     </message>
     <message>
+        <location filename="../host/app/NearestName.cpp"/>
+        <source>did you mean "%1"?</source>
+        <translation>"%1" のことですか?</translation>
+    </message>
+    <message>
         <location filename="../host/app/ReplaceFile.cpp"/>
         <source>not all of it could be written</source>
         <translation>すべてを書き込むことはできませんでした</translation>
@@ -851,6 +856,36 @@
         <translation>→</translation>
     </message>
     <message>
+        <location filename="../sources/ColumnBinding.cpp"/>
+        <source>one of %1 was expected</source>
+        <translation>次のいずれかが必要です: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/ColumnBinding.cpp"/>
+        <source>there is no column %1: one of 1 to %2 was expected</source>
+        <translation>列 %1 はありません: 1 から %2 のいずれかが必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/ColumnBinding.cpp"/>
+        <source>there is no column "%1"</source>
+        <translation>列 "%1" はありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/ColumnBinding.cpp"/>
+        <source>the columns %1 and %2 are both named "%3": each variable was expected once</source>
+        <translation>列 %1 と列 %2 の名前がどちらも「%3」です: 変数はそれぞれ 1 回だけ指定できます</translation>
+    </message>
+    <message>
+        <location filename="../sources/ColumnBinding.cpp"/>
+        <source>the dictionary has no variable "%1"</source>
+        <translation>辞書に変数 "%1" はありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/ColumnBinding.cpp"/>
+        <source>the variable "%1" has two columns: each variable was expected once</source>
+        <translation>変数 "%1" に列が 2 つあります: 各変数は 1 回だけ必要です</translation>
+    </message>
+    <message>
         <location filename="../sources/FileBytesPosix.cpp"/>
         <source>the file was cut short while it was read</source>
         <translation>読み込み中にファイルが切り詰められました</translation>
@@ -861,9 +896,74 @@
         <translation>ファイルではない入力から %1 MB を超えるデータが読み込まれました</translation>
     </message>
     <message>
+        <location filename="../sources/GeometryColumns.cpp"/>
+        <source>the value "%1" of the column "%2" does not fit: %3 was expected</source>
+        <translation>列 "%2" の値 "%1" は適合しません: %3 が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/PointGeometry.cpp"/>
+        <source>bytes that are no geometry</source>
+        <translation>ジオメトリでないバイト列</translation>
+    </message>
+    <message>
+        <location filename="../sources/PointGeometry.cpp"/>
+        <source>a line string</source>
+        <translation>折れ線</translation>
+    </message>
+    <message>
+        <location filename="../sources/PointGeometry.cpp"/>
+        <source>a polygon</source>
+        <translation>ポリゴン</translation>
+    </message>
+    <message>
+        <location filename="../sources/PointGeometry.cpp"/>
+        <source>several points</source>
+        <translation>複数の点</translation>
+    </message>
+    <message>
+        <location filename="../sources/PointGeometry.cpp"/>
+        <source>several line strings</source>
+        <translation>複数の折れ線</translation>
+    </message>
+    <message>
+        <location filename="../sources/PointGeometry.cpp"/>
+        <source>several polygons</source>
+        <translation>複数のポリゴン</translation>
+    </message>
+    <message>
+        <location filename="../sources/PointGeometry.cpp"/>
+        <source>a collection of geometries</source>
+        <translation>ジオメトリの集まり</translation>
+    </message>
+    <message>
+        <location filename="../sources/PointGeometry.cpp"/>
+        <source>a geometry of another kind</source>
+        <translation>別の種類のジオメトリ</translation>
+    </message>
+    <message>
         <location filename="../sources/RowBatches.cpp"/>
         <source>there is not enough memory for the data</source>
         <translation>データを読み込むメモリが足りません</translation>
+    </message>
+    <message>
+        <location filename="../sources/SpooledBytes.cpp"/>
+        <source>the data cannot be kept in a temporary file: %1</source>
+        <translation>データを一時ファイルに保持できません: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/TextEncoding.cpp"/>
+        <source>the file is not UTF-16</source>
+        <translation>ファイルは UTF-16 ではありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/TextEncoding.cpp"/>
+        <source>the file is not Windows-1252: it has a byte that is no character there</source>
+        <translation>ファイルは Windows-1252 ではありません: 文字でないバイトがあります</translation>
+    </message>
+    <message>
+        <location filename="../sources/TextEncoding.cpp"/>
+        <source>the file has no byte-order mark: UTF-16 with its mark was expected</source>
+        <translation>ファイルにバイト順マークがありません: マーク付きの UTF-16 が必要です</translation>
     </message>
     <message>
         <location filename="../sources/ValueParser.cpp"/>
@@ -887,38 +987,38 @@
     </message>
     <message>
         <location filename="../sources/ValueParser.cpp"/>
+        <source>a number, or an offset such as 12.5R</source>
+        <translation>数値、または 12.5R のようなオフセット</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
+        <source>a number, or ByLayer</source>
+        <translation>数値、または ByLayer</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
+        <source>a number, or an angle such as 45°30'15"</source>
+        <translation>数値、または 45°30'15" のような角度</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
+        <source>a number, or a bearing such as N45-30-15E</source>
+        <translation>数値、または N45-30-15E のような方位</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
         <source>an angle such as 45-30-15</source>
         <translation>45-30-15 のような角度</translation>
     </message>
     <message>
         <location filename="../sources/ValueParser.cpp"/>
+        <source>a bearing such as 45-30-15 or N45-30-15E</source>
+        <translation>45-30-15 や N45-30-15E のような方位</translation>
+    </message>
+    <message>
+        <location filename="../sources/ValueParser.cpp"/>
         <source>a number</source>
         <translation>数値</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvObjectList.cpp"/>
-        <source>a header row of variable names was expected</source>
-        <translation>変数名の見出し行が必要です</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvObjectList.cpp"/>
-        <source>the columns %1 and %2 are both named "%3": each variable was expected once</source>
-        <translation>列 %1 と列 %2 の名前がどちらも「%3」です: 変数はそれぞれ 1 回だけ指定できます</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvObjectList.cpp"/>
-        <source>no column of the header row is a variable of the dictionary: a header row of variable names, with the data's delimiter between them, was expected</source>
-        <translation>見出し行に辞書の変数がありません: 変数名をデータの区切り文字で区切った見出し行が必要です</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvObjectList.cpp"/>
-        <source>the row has %1 cells: %2 were expected, as in the header row</source>
-        <translation>行のセル数が %1 です: 見出し行と同じ %2 が必要です</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvObjectList.cpp"/>
-        <source>the cell "%1" of the column "%2" does not fit: %3 was expected</source>
-        <translation>列「%2」のセル「%1」が不正です: %3が必要です</translation>
     </message>
     <message>
         <location filename="../sources/csv/CsvReader.cpp"/>
@@ -927,7 +1027,7 @@
     </message>
     <message>
         <location filename="../sources/csv/CsvReader.cpp"/>
-        <source>a delimiter was expected behind the closing quote</source>
+        <source>a delimiter was expected after the closing quote</source>
         <translation>終わりの引用符の後に区切り文字が必要です</translation>
     </message>
     <message>
@@ -954,6 +1054,157 @@
         <location filename="../sources/csv/CsvReader.cpp"/>
         <source>the row is longer than %1 bytes: a table of rows was expected</source>
         <translation>行が %1 バイトを超えています: 行からなる表が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRows.cpp"/>
+        <source>"%1" is no order of columns: each of the letters P, N, E, Z and D at most once, and - for a column that is passed over, was expected, such as PNEZD</source>
+        <translation>"%1" は列の順序ではありません: 文字 P、N、E、Z、D をそれぞれ 1 回まで、読み飛ばす列には - を使い、PNEZD のように指定する必要があります</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRows.cpp"/>
+        <source>a header row of variable names was expected</source>
+        <translation>変数名の見出し行が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRows.cpp"/>
+        <source>a header row was expected</source>
+        <translation>見出し行が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRows.cpp"/>
+        <source>no column of the header row is a variable of the dictionary: a header row of variable names, with the data's delimiter between them, was expected</source>
+        <translation>見出し行に辞書の変数がありません: 変数名をデータの区切り文字で区切った見出し行が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRows.cpp"/>
+        <source>no column is a variable of the dictionary: without a header row, columns with their numbers were expected, or an order such as PNEZD</source>
+        <translation>辞書の変数である列がありません: 見出し行がない場合は、番号付きの列、または PNEZD のような順序が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRows.cpp"/>
+        <source>the row has %1 cells: %2 were expected, as in the header row</source>
+        <translation>行のセル数が %1 です: 見出し行と同じ %2 が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRows.cpp"/>
+        <source>the row has %1 cells: %2 were expected, as in all rows</source>
+        <translation>行に %1 個のセルがあります: すべての行と同じ %2 個が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRows.cpp"/>
+        <source>the cell "%1" of the column "%2" does not fit: %3 was expected</source>
+        <translation>列「%2」のセル「%1」が不正です: %3が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/DelimiterGuess.cpp"/>
+        <source>blanks and tabs</source>
+        <translation>空白とタブ</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/DelimiterGuess.cpp"/>
+        <source>the comma</source>
+        <translation>コンマ</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/DelimiterGuess.cpp"/>
+        <source>the semicolon</source>
+        <translation>セミコロン</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/DelimiterGuess.cpp"/>
+        <source>the tab</source>
+        <translation>タブ</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/DelimiterGuess.cpp"/>
+        <source>the vertical bar</source>
+        <translation>縦棒</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/DelimiterGuess.cpp"/>
+        <source>the delimiter cannot be found out: with a comma, a semicolon, a tab, a vertical bar, or blanks and tabs, the first rows do not have the same number of cells that fit their variables. The delimiter itself was expected</source>
+        <translation>区切り文字を特定できません: コンマ、セミコロン、タブ、縦棒、空白とタブのいずれでも、最初の行のセル数が一致して変数に合うことはありません。区切り文字そのものが必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/DelimiterGuess.cpp"/>
+        <source>the delimiter cannot be found out: it may be %1. The delimiter itself was expected</source>
+        <translation>区切り文字を特定できません: %1 の可能性があります。区切り文字そのものが必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/DelimiterGuess.cpp"/>
+        <source> or </source>
+        <comment>between two delimiters</comment>
+        <translation> または </translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>a list of objects, or an object a line, was expected</source>
+        <translation>オブジェクトの一覧、または 1 行に 1 つのオブジェクトが必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>a comma or the end of the list was expected</source>
+        <translation>コンマ、または一覧の終わりが必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>the end of the line was expected: each object stands in a line of its own</source>
+        <translation>行の終わりが必要です: 各オブジェクトはそれぞれの行に置かれます</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>an object was expected</source>
+        <translation>オブジェクトが必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>nothing was expected after the list</source>
+        <translation>一覧の後には何も必要ありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>the object is longer than %1 bytes: a list of rows was expected</source>
+        <translation>オブジェクトが %1 バイトより長いです: 行の一覧が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>the key "%1" stands twice in an object</source>
+        <translation>キー "%1" がオブジェクトに 2 回あります</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>the variable "%1" stands twice: each variable was expected once</source>
+        <translation>変数「%1」が 2 回あります: 変数はそれぞれ 1 回だけ指定できます</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>this is no JSON: %1</source>
+        <translation>これは JSON ではありません: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <source>the value of "%1" does not fit: %2 was expected</source>
+        <translation>「%1」の値が不正です: %2が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonKeys.cpp"/>
+        <source>the columns of JSON have no numbers: the name of a key was expected</source>
+        <translation>JSON の列に番号はありません: キーの名前が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonKeys.cpp"/>
+        <source>no object has the key "%1"</source>
+        <translation>キー "%1" を持つオブジェクトがありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonKeys.cpp"/>
+        <source>no key of the objects is a variable of the dictionary: there are %1</source>
+        <translation>辞書の変数であるキーがオブジェクトにありません: あるのは %1 です</translation>
+    </message>
+    <message>
+        <location filename="../sources/json/JsonKeys.cpp"/>
+        <source>none</source>
+        <translation>なし</translation>
     </message>
     <message>
         <location filename="../sources/landxml/AlignmentRows.cpp"/>
@@ -1266,12 +1517,192 @@
         <translation>要素の入れ子が %1 段を超えています</translation>
     </message>
     <message>
-        <location filename="../jobs/JobData.cpp"/>
+        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
+        <source>(character %1 of the query)</source>
+        <translation>(クエリの %1 文字目)</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
+        <source>this is no connection: %1. Words such as service=survey, host=..., port=..., dbname=... and user=... were expected</source>
+        <translation>これは接続ではありません: %1。service=survey、host=...、port=...、dbname=...、user=... のような語が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
+        <source>a connection has no "%1": a password is read from the user's own password file (~/.pgpass) or from PGPASSWORD</source>
+        <translation>接続に "%1" はありません: パスワードはユーザー自身のパスワードファイル (~/.pgpass) または PGPASSWORD から読み取られます</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
+        <source>the server does not answer</source>
+        <translation>サーバーが応答しません</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
+        <source>the server wants a password: it was expected in the user's own password file (~/.pgpass) or in PGPASSWORD</source>
+        <translation>サーバーがパスワードを求めています: ユーザー自身のパスワードファイル (~/.pgpass) または PGPASSWORD に必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
+        <source>the server cannot be connected to: %1</source>
+        <translation>サーバーに接続できません: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
+        <source>the connection to the server is lost: %1</source>
+        <translation>サーバーとの接続が失われました: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
+        <source>the database does not answer the query: %1</source>
+        <translation>データベースがクエリに応答しません: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresRows.cpp"/>
+        <source>the query has %1 parameters: values of %2 are given</source>
+        <translation>クエリにはパラメーターが %1 個あります: 与えられた値は %2 個です</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresRows.cpp"/>
+        <source>the query is not a single SELECT, which was expected</source>
+        <translation>クエリは単一の SELECT ではありません。単一の SELECT が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresRows.cpp"/>
+        <source>the columns "%1" and "%2" both have geometries: a query with one of them was expected</source>
+        <translation>列 "%1" と "%2" の両方にジオメトリがあります: そのうち 1 つだけを含むクエリが必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresRows.cpp"/>
+        <source>no column is a variable of the dictionary: there are %1</source>
+        <translation>辞書の変数である列がありません: あるのは %1 です</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresRows.cpp"/>
+        <source>there is %1: a point was expected</source>
+        <translation>%1 があります: 点が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresRows.cpp"/>
+        <source>row %1: </source>
+        <translation>行 %1: </translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>a database was expected, which is a file</source>
+        <translation>ファイルであるデータベースが必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>the query has parameters: values were expected in their places</source>
+        <translation>クエリにパラメーターがあります: その場所には値が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>the database is locked: another program writes to it</source>
+        <translation>データベースはロックされています: 別のプログラムが書き込み中です</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>the file is no SQLite database, or it is encrypted</source>
+        <translation>ファイルは SQLite データベースではないか、暗号化されています</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>the database is broken: %1</source>
+        <translation>データベースが壊れています: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>a program that wrote to the database has not ended its work: it was expected to be opened by that program first</source>
+        <translation>データベースに書き込んでいたプログラムが作業を終えていません: 先にそのプログラムで開く必要があります</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>the database cannot be opened: %1</source>
+        <translation>データベースを開けません: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>the database cannot be read: %1</source>
+        <translation>データベースを読み取れません: %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>reading was stopped</source>
+        <translation>読み取りは中止されました</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteFile.cpp"/>
+        <source>the database was changed while it was read, by a program that does not use SQLite</source>
+        <translation>読み取り中に、SQLite を使わないプログラムによってデータベースが変更されました</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteRows.cpp"/>
+        <source>the database has no table "%1"</source>
+        <translation>データベースに表 "%1" はありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteRows.cpp"/>
+        <source>%1 bytes</source>
+        <translation>%1 バイト</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ColumnChoices.cpp"/>
+        <source>the name of a column, or its number from 1, was expected</source>
+        <translation>列の名前、または 1 から始まる番号が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ColumnNotes.cpp"/>
+        <source>the column "%1" is no variable of the dictionary "%2"</source>
+        <translation>列「%1」は辞書「%2」の変数ではありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/CsvData.cpp"/>
+        <source>a row was expected after the header row: a block shows the first one</source>
+        <translation>見出し行の後に行が必要です: ブロックは最初の行を表示します</translation>
+    </message>
+    <message>
+        <location filename="../jobs/CsvData.cpp"/>
+        <source>a row was expected: a block shows the first one</source>
+        <translation>行が必要です: ブロックは最初の行を表示します</translation>
+    </message>
+    <message>
+        <location filename="../jobs/CsvOptions.cpp"/>
+        <source>the names of the columns in their order were expected</source>
+        <translation>列の名前を順に並べたものが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/CsvOptions.cpp"/>
+        <source>one character that is neither a digit, a letter nor a sign, and not the decimal sign, was expected</source>
+        <translation>数字、英字、符号、小数点のいずれでもない 1 文字が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/CsvOptions.cpp"/>
+        <source>a text of one ASCII character that is neither a quote nor a line end, or one of %1, was expected</source>
+        <translation>引用符でも改行でもない ASCII 1 文字、または %1 のいずれかが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/CsvOptions.cpp"/>
+        <source>an order of columns such as PNEZD was expected: each of the letters P, N, E, Z and D at most once, and - for a column that is passed over</source>
+        <translation>PNEZD のような列の順序が必要です: P、N、E、Z、D はそれぞれ 1 回まで、- は読み飛ばす列</translation>
+    </message>
+    <message>
+        <location filename="../jobs/CsvOptions.cpp"/>
+        <source>the columns have names already: either an order or a list of columns was expected</source>
+        <translation>列にはすでに名前があります: 順序か列のリストのどちらか一方が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/CsvOptions.cpp"/>
+        <source>a text of one ASCII character that is neither a quote nor a line end was expected</source>
+        <translation>引用符と改行を除く ASCII 1 文字のテキストが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/DataFiles.cpp"/>
         <source>the data file "%1" cannot be read: %2</source>
         <translation>データファイル「%1」を読み込めません: %2</translation>
     </message>
     <message>
-        <location filename="../jobs/JobData.cpp"/>
+        <location filename="../jobs/DataKind.cpp"/>
         <source>Reading %1</source>
         <translation>読み込み中: %1</translation>
     </message>
@@ -1281,9 +1712,24 @@
         <translation>データ「%1」に行がありません: ブロックには最初の行が表示されます</translation>
     </message>
     <message>
-        <location filename="../jobs/JobData.cpp"/>
-        <source>a row was expected behind the header row: a block shows the first one</source>
-        <translation>見出し行の後に行が必要です: ブロックには最初の行が表示されます</translation>
+        <location filename="../jobs/JobDataReader.cpp"/>
+        <source>one of the keys %1 was expected</source>
+        <translation>キー %1 のいずれかが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobDataReader.cpp"/>
+        <source>only one of the keys %1 was expected</source>
+        <translation>キー %1 のうち 1 つだけが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobDataReader.cpp"/>
+        <source>standard input is the job itself: a file was expected</source>
+        <translation>標準入力はジョブそのものです: ファイルが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobFileName.cpp"/>
+        <source>a file name without a character 0 was expected</source>
+        <translation>文字コード 0 を含まないファイル名が必要です</translation>
     </message>
     <message>
         <location filename="../jobs/JobFiles.cpp"/>
@@ -1342,11 +1788,6 @@
     </message>
     <message>
         <location filename="../jobs/JobReader.cpp"/>
-        <source>one of %1 was expected</source>
-        <translation>次のいずれかが必要です: %1</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
         <source>a list of four margins (left, top, right, bottom) was expected</source>
         <translation>4 つの余白 (左、上、右、下) のリストが必要です</translation>
     </message>
@@ -1354,26 +1795,6 @@
         <location filename="../jobs/JobReader.cpp"/>
         <source>a character code or a text of one character was expected</source>
         <translation>文字コードまたは 1 文字のテキストが必要です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>a file name without a character 0 was expected</source>
-        <translation>文字コード 0 を含まないファイル名が必要です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>either "csv" or "values" was expected</source>
-        <translation>"csv" と "values" のどちらか一方が必要です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>an object or a list of objects was expected</source>
-        <translation>オブジェクトまたはオブジェクトのリストが必要です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>a text of one ASCII character that is neither a quote nor a line end was expected</source>
-        <translation>引用符と改行を除く ASCII 1 文字のテキストが必要です</translation>
     </message>
     <message>
         <location filename="../jobs/JobReader.cpp"/>
@@ -1437,11 +1858,6 @@
     </message>
     <message>
         <location filename="../jobs/JobSteps.cpp"/>
-        <source>none</source>
-        <translation>なし</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobSteps.cpp"/>
         <source>the %1 "%2" cannot be written: the template has no dictionary named "%3"</source>
         <translation>%1「%2」は出力できません: テンプレートに「%3」という名前の辞書がありません</translation>
     </message>
@@ -1449,6 +1865,31 @@
         <location filename="../jobs/JobSteps.cpp"/>
         <source>the %1 "%2" cannot be written: the format of its field "%3" is beyond %4 characters</source>
         <translation>%1「%2」は出力できません: フィールド「%3」の書式が %4 文字を超えています</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>no column fills the field "%1" of the %2 "%3"</source>
+        <translation>%2「%3」の項目「%1」に対応する列がありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>the data "%1" does not say the unit of its numbers: %2 was taken</source>
+        <translation>データ「%1」は数値の単位を示していません: %2 とみなしました</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>%1 values are wider than the field "%2" of the table "%3" and show as #, the first one in row %4, line %5 of the report</source>
+        <translation>%1 個の値が表「%3」の項目「%2」より長く、# で表示されます。最初は行 %4、レポートの %5 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>%1 values are wider than the field "%2" of the table "%3", the first one in row %4, line %5 of the report</source>
+        <translation>%1 個の値が表「%3」の項目「%2」より長くなっています。最初は行 %4、レポートの %5 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobSteps.cpp"/>
+        <source>%1 values of the field "%2" of the table "%3" are missing and show as 0, the first one in row %4, line %5 of the report</source>
+        <translation>表「%3」の項目「%2」の値が %1 個なく、0 と表示されます。最初は行 %4、レポートの %5 行目です</translation>
     </message>
     <message>
         <location filename="../jobs/JobStepsReader.cpp"/>
@@ -1497,11 +1938,6 @@
     </message>
     <message>
         <location filename="../jobs/JsonNode.cpp"/>
-        <source>an object was expected</source>
-        <translation>オブジェクトが必要です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JsonNode.cpp"/>
         <source>a list was expected</source>
         <translation>リストが必要です</translation>
     </message>
@@ -1509,16 +1945,6 @@
         <location filename="../jobs/JsonNode.cpp"/>
         <source>unknown key "%1": %2 expected</source>
         <translation>不明なキー "%1": 使用できるキー: %2</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JsonObjectList.cpp"/>
-        <source>the variable "%1" stands twice: each variable was expected once</source>
-        <translation>変数「%1」が 2 回あります: 変数はそれぞれ 1 回だけ指定できます</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JsonObjectList.cpp"/>
-        <source>the value of "%1" does not fit: %2 was expected</source>
-        <translation>「%1」の値が不正です: %2が必要です</translation>
     </message>
     <message>
         <location filename="../jobs/JsonSource.cpp"/>
@@ -1561,6 +1987,11 @@
         <translation>ジョブにはキー "%1" を設定できません</translation>
     </message>
     <message>
+        <location filename="../jobs/PostgresData.cpp"/>
+        <source>a text, a number, true, false or null was expected</source>
+        <translation>文字列、数値、true、false、null のいずれかが必要です</translation>
+    </message>
+    <message>
         <location filename="../jobs/SavedText.cpp"/>
         <source>a saved report was expected; this is a PDF</source>
         <translation>保存された帳票が必要です。これは PDF です</translation>
@@ -1569,6 +2000,16 @@
         <location filename="../jobs/SavedText.cpp"/>
         <source>a report file was expected; this is no UTF-8</source>
         <translation>帳票ファイルが必要です。これは UTF-8 ではありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/SqliteData.cpp"/>
+        <source>there is no database "%1"</source>
+        <translation>データベース「%1」はありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/SqliteData.cpp"/>
+        <source>either "table" or "query" was expected</source>
+        <translation>"table" か "query" のどちらか一方が必要です</translation>
     </message>
     <message>
         <location filename="../jobs/TemplateSource.cpp"/>
@@ -1611,6 +2052,11 @@
         <translation>「%1」という名前のテンプレートがありません。使用できるもの: %2</translation>
     </message>
     <message>
+        <location filename="../jobs/ValuesData.cpp"/>
+        <source>an object or a list of objects was expected</source>
+        <translation>オブジェクトまたはオブジェクトのリストが必要です</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/CommandLineJob.cpp"/>
         <source>kareport: the report will have at least %1</source>
         <translation>kareport: レポートは少なくとも %1 になります</translation>
@@ -1624,6 +2070,11 @@
         <location filename="../apps/kareport/CommandLineJob.cpp"/>
         <source>kareport: stopped; nothing was written</source>
         <translation>kareport: 中断されました。何も書き込まれていません</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineJob.cpp"/>
+        <source>kareport: "%1" could not be written: %2</source>
+        <translation>kareport: 「%1」を書き込めませんでした: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CommandOutputs.cpp"/>
@@ -1679,6 +2130,16 @@
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>--set: %1</source>
         <translation>--set: %1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/DataOptions.cpp"/>
+        <source>--units "%1": QUANTITY=UNIT was expected, as in length=usft</source>
+        <translation>--units "%1": length=usft のような 量=単位 が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/DataOptions.cpp"/>
+        <source>--columns "%1": the names of the columns in their order, or VARIABLE=COLUMN for each, were expected</source>
+        <translation>--columns "%1": 列の名前を順に並べたもの、または各列の 変数=列 が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>
@@ -1737,6 +2198,11 @@
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
+        <source>standard input is the list of jobs: no job is read from it</source>
+        <translation>標準入力はジョブのリストです: そこからジョブは読み込みません</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderCommand.cpp"/>
         <source>--slice takes a part of several job files: these were expected</source>
         <translation>--slice は複数のジョブファイルの一部を選びます: ジョブファイルが必要です</translation>
     </message>
@@ -1749,6 +2215,16 @@
         <location filename="../apps/kareport/RenderCommand.cpp"/>
         <source>-o "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
         <translation>-o "%1" は複数のジョブに対して 1 つのファイルです: ジョブファイル名を表す {} を含む名前が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderCommand.cpp"/>
+        <source>--notes "%1": the name of a file was expected</source>
+        <translation>--notes "%1": ファイル名が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/RenderCommand.cpp"/>
+        <source>--notes "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
+        <translation>--notes "%1" は複数のジョブに対して 1 つのファイルです: ジョブファイルの名前を表す {} を含む名前が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
@@ -1786,6 +2262,15 @@
 
 %2</source>
         <translation>「%1」を開きましたが、表示されない内容があります:
+
+%2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
+        <source>The report was made. Notes on its data: %1
+
+%2</source>
+        <translation>レポートを作成しました。データに関する注意: %1
 
 %2</translation>
     </message>
@@ -2008,6 +2493,11 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>It gets reports as plain text.</source>
         <translation>帳票はプレーンテキストで渡されます。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
+        <source>a window has no standard input: a file was expected</source>
+        <translation>ウィンドウには標準入力がありません: ファイルが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>

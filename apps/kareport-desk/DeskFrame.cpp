@@ -50,6 +50,26 @@ void sayWhatIsNotShown(const QString &path, const kareport::ReadNotes &notes)
     }
 }
 
+/// Says how many notes there are on a report that was made, and the first of them.
+void sayNotes(const kareport::JobNotes &notes)
+{
+    constexpr qsizetype mostShown = 20;
+    QStringList lines;
+    const std::vector<kareport::JobNote> said = notes.said();
+    for (const kareport::JobNote &note : said) {
+        if (lines.size() == mostShown) {
+            lines.append(QStringLiteral("…"));
+            break;
+        }
+        lines.append(note.message());
+    }
+    if (!lines.isEmpty()) {
+        kareport::showMessage({Xlate("The report was made. Notes on its data: %1\n\n%2")
+                                   .arg(QString::number(said.size()), lines.join(u'\n')),
+                               QString(), MessageButtons::Ok, kareport::MessageIcon::Information});
+    }
+}
+
 /// What is said of a file that is there and could not be read.
 QString whyNotRead(const QString &path, const kareport::ReadNotes &notes)
 {
@@ -160,8 +180,13 @@ bool DeskFrame::finishOpening(UDocument *report, const QString &error)
 bool DeskFrame::OpenTemplateJob(const kareport::TemplateJob &job)
 {
     QString error;
-    UDocument *report = kareport::launchTemplateJob(job, this, error);
-    return finishOpening(report, error);
+    kareport::JobNotes notes;
+    UDocument *report = kareport::launchTemplateJob(job, this, error, notes);
+    const bool isMade = finishOpening(report, error);
+    if (isMade) {
+        sayNotes(notes);
+    }
+    return isMade;
 }
 
 bool DeskFrame::OpenFile(const QString &path)
@@ -175,26 +200,32 @@ bool DeskFrame::OpenFile(const QString &path)
         fromTemplate(path);
         return true;
     }
-    UDocument *report = nullptr;
-    QString error;
     if (path.endsWith(u".json", Qt::CaseInsensitive)) {
-        report = kareport::launchJob(path, this, error);
-        if (report != nullptr) {
-            UApplication::Get()->AddToRecentFileList(path);
-        }
-    } else {
-        const QString file = QDir::cleanPath(QFileInfo(path).absoluteFilePath());
-        if (reading_.contains(file)) {
-            return true;
-        }
-        kareport::ReadNotes notes;
-        report = openReport(file, notes);
-        error = report == nullptr && !notes.isStopped ? whyNotRead(path, notes) : QString();
-        const bool isOpened = finishOpening(report, error);
-        sayWhatIsNotShown(path, notes);
-        return isOpened;
+        return openJob(path);
     }
-    return finishOpening(report, error);
+    const QString file = QDir::cleanPath(QFileInfo(path).absoluteFilePath());
+    if (reading_.contains(file)) {
+        return true;
+    }
+    kareport::ReadNotes notes;
+    UDocument *report = openReport(file, notes);
+    const QString error = report == nullptr && !notes.isStopped ? whyNotRead(path, notes) : QString();
+    const bool isOpened = finishOpening(report, error);
+    sayWhatIsNotShown(path, notes);
+    return isOpened;
+}
+
+bool DeskFrame::openJob(const QString &path)
+{
+    QString error;
+    kareport::JobNotes notes;
+    UDocument *report = kareport::launchJob(path, this, error, notes);
+    const bool isMade = finishOpening(report, error);
+    if (isMade) {
+        UApplication::Get()->AddToRecentFileList(path);
+        sayNotes(notes);
+    }
+    return isMade;
 }
 
 UDocument *DeskFrame::openReport(const QString &file, kareport::ReadNotes &notes)

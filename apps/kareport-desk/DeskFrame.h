@@ -63,6 +63,8 @@ private:
     void fromTemplate(const QString &templateFile);
     void askPreferences();
     bool finishOpening(UDocument *report, const QString &error);
+    /// Runs a job, and says what there is to note on its report.
+    bool openJob(const QString &path);
     /// The report of a file, which is opened where it is not open.
     UDocument *openReport(const QString &file, kareport::ReadNotes &notes);
     /// Opens a report in whatever way, while its file counts as being opened: what changes in it meanwhile is told.

@@ -1,6 +1,7 @@
 #include "JobLauncher.h"
 
 #include "CViewPane.h"
+#include "DataKind.h"
 #include "DeskPreferences.h"
 #include "Interrupt.h"
 #include "JobReader.h"
@@ -85,11 +86,15 @@ std::optional<InputError> dataThatIsNoFile(const Job &job, const JsonSource &sou
     QStringList names = job.data.keys();
     names.sort();
     for (const QString &name : names) {
-        const QString &csv = job.data.constFind(name)->csv;
-        if (QFileInfo(csv).exists() && !QFileInfo(csv).isFile()) {
-            return source.errorAt(
-                {QStringLiteral("data"), name, QStringLiteral("csv")},
-                Xlate("the data file \"%1\" cannot be read: %2").arg(csv, Xlate("it is a folder, a pipe or a device")));
+        const Job::DataSet &set = *job.data.constFind(name);
+        const JsonPath place = {QStringLiteral("data"), name, set.kind};
+        if (set.source->readsStandardInput()) {
+            return source.errorAt(place, Xlate("a window has no standard input: a file was expected"));
+        }
+        for (const QString &file : set.source->files()) {
+            if (QFileInfo(file).exists() && !QFileInfo(file).isFile()) {
+                return source.errorAt(place, unreadableData(file, Xlate("it is a folder, a pipe or a device")));
+            }
         }
     }
     return std::nullopt;
@@ -105,7 +110,7 @@ void endRichTextMode(UReportDoc *report)
 }
 
 /// Runs a job that has been read. @return the report; null when it was not made
-UReportDoc *makeReport(const Job &job, const JsonSource &source, QWidget *parent, QString &error)
+UReportDoc *makeReport(const Job &job, const JsonSource &source, QWidget *parent, QString &error, JobNotes &notes)
 {
     DialogProgress progress(parent);
     UReportDoc *report = makeShown(job.header, job.title.value_or(QFileInfo(source.path()).completeBaseName()));
@@ -115,7 +120,9 @@ UReportDoc *makeReport(const Job &job, const JsonSource &source, QWidget *parent
     }
     std::optional<InputError> wrong;
     try {
-        wrong = JobRunner(job, source, progress).run(*report);
+        JobRunner runner(job, source, progress);
+        wrong = runner.run(*report);
+        notes = runner.notes();
     } catch (const std::bad_alloc &) {
         endRichTextMode(report);
         closeReport(report); // half a report is none
@@ -134,7 +141,7 @@ UReportDoc *makeReport(const Job &job, const JsonSource &source, QWidget *parent
     return report;
 }
 
-UReportDoc *runJob(const Expected<JsonSource> &read, QWidget *parent, QString &error)
+UReportDoc *runJob(const Expected<JsonSource> &read, QWidget *parent, QString &error, JobNotes &notes)
 {
     if (const InputError *wrong = errorOf(read)) {
         error = wrong->message();
@@ -150,11 +157,11 @@ UReportDoc *runJob(const Expected<JsonSource> &read, QWidget *parent, QString &e
         error = wrong->message();
         return nullptr;
     }
-    return makeReport(std::get<Job>(job), source, parent, error);
+    return makeReport(std::get<Job>(job), source, parent, error, notes);
 }
 
 template <typename Read>
-UReportDoc *launch(const Read &read, QWidget *parent, QString &error)
+UReportDoc *launch(const Read &read, QWidget *parent, QString &error, JobNotes &notes)
 {
     if (runningJob()) {
         error = Xlate("Another job is running. Wait for its end, or cancel it.");
@@ -163,7 +170,7 @@ UReportDoc *launch(const Read &read, QWidget *parent, QString &error)
     const QScopedValueRollback<bool> running(runningJob(), true);
     setInterrupted(false);
     try {
-        return runJob(read(), parent, error);
+        return runJob(read(), parent, error, notes);
     } catch (const std::bad_alloc &) {
         error = Xlate("There is not enough memory for this input.");
         return nullptr;
@@ -177,14 +184,14 @@ bool isJobRunning()
     return runningJob();
 }
 
-UReportDoc *launchJob(const QString &path, QWidget *parent, QString &error)
+UReportDoc *launchJob(const QString &path, QWidget *parent, QString &error, JobNotes &notes)
 {
-    return launch([&path] { return JsonSource::read(path); }, parent, error);
+    return launch([&path] { return JsonSource::read(path); }, parent, error, notes);
 }
 
-UReportDoc *launchTemplateJob(const TemplateJob &job, QWidget *parent, QString &error)
+UReportDoc *launchTemplateJob(const TemplateJob &job, QWidget *parent, QString &error, JobNotes &notes)
 {
-    return launch([&job] { return Expected<JsonSource>(JsonSource::fromObject(job.toJson())); }, parent, error);
+    return launch([&job] { return Expected<JsonSource>(JsonSource::fromObject(job.toJson())); }, parent, error, notes);
 }
 
 } // namespace kareport

@@ -7,9 +7,11 @@
 #include "JobReader.h"
 #include "LeastSize.h"
 #include "ProcessSetup.h"
+#include "ReplaceFile.h"
 #include "ReportTextCodec.h"
 #include "Signals.h"
 #include "SizeLimit.h"
+#include "TerminalProgress.h"
 #include "Xlate.h"
 
 #include <QFileInfo>
@@ -68,11 +70,26 @@ void CommandLineJob::takeOutputs(std::optional<OutputKind> kindOtherwise)
     }
 }
 
+/// The file that the notes go to; empty for none.
+QString CommandLineJob::notesFile() const
+{
+    QString file = command_.notes.value_or(QString());
+    return source_.path().isEmpty() ? file
+                                    : file.replace(QStringLiteral("{}"), QFileInfo(source_.path()).completeBaseName());
+}
+
 /// No output may take the place of what the report is made of, or of another output.
 void CommandLineJob::checkOutputs()
 {
     const auto clash = outputClash(job_, source_.path());
     if (!clash) {
+        // Notes are an output as well, though no job has them among its own.
+        Job withNotes = job_;
+        withNotes.outputs.push_back({notesFile(), OutputKind::Text});
+        const auto other = command_.notes ? outputClash(withNotes, source_.path()) : std::nullopt;
+        if (other) {
+            fail(other->text);
+        }
         return;
     }
     const QString key = QStringLiteral("output");
@@ -151,6 +168,47 @@ ExitStatus CommandLineJob::madeStatus(const UReportDoc &report, const std::optio
     return error ? fail(exitInput, error->message()) : exitDone;
 }
 
+/// Makes the report, and says what there is to note.
+std::optional<InputError> CommandLineJob::make(JobRunner &runner, UReportDoc &report, ReportTextWriter *stream)
+{
+    if (command_.strict) {
+        runner.beStrict();
+    }
+    auto error = runner.run(report, stream);
+    if (!isInterrupted() && !isReaderGone()) {
+        sayNotes(runner.notes());
+    }
+    return error;
+}
+
+void CommandLineJob::sayNotes(const JobNotes &notes)
+{
+    const bool isStrict = command_.strict || job_.strict;
+    // Of notes that are errors the first one is said as the error that ends the job.
+    const std::vector<JobNote> said = notes.said();
+    for (std::size_t i = isStrict ? 1 : 0; i < said.size(); ++i) {
+        const JobNote &note = said[i];
+        if (isStrict || !command_.quiet) {
+            eraseProgress();
+            printError(isStrict ? note.about.message() : note.message());
+        }
+    }
+    areNotesWritten_ = !command_.notes || writeNotes(notes);
+}
+
+/// @return whether the file with the notes was written
+bool CommandLineJob::writeNotes(const JobNotes &notes)
+{
+    const QByteArray json = notes.toJson();
+    QString problem;
+    const bool isWritten = replaceFile(
+        notesFile(), [&json](QIODevice &device) { return device.write(json) == json.size(); }, &problem);
+    if (!isWritten) {
+        printError(Xlate("kareport: \"%1\" could not be written: %2").arg(notesFile(), problem));
+    }
+    return isWritten;
+}
+
 /// Makes the report straight into its output. @return nothing, and nothing made, when the output cannot be opened
 std::optional<ExitStatus> CommandLineJob::runIntoOutput(JobRunner &runner, UReportDoc &report, const Output &output,
                                                         Progress &progress)
@@ -163,7 +221,7 @@ std::optional<ExitStatus> CommandLineJob::runIntoOutput(JobRunner &runner, URepo
     const auto problem = replaceOutput(output, [&](QIODevice &device, QString & /*problem*/) {
         isOpen = true;
         ReportTextWriter writer(device, isReport ? LineEnds::ReportFile : LineEnds::PlainText);
-        inputError = runner.run(report, &writer);
+        inputError = make(runner, report, &writer);
         if (inputError || isInterrupted()) {
             report.StreamText(nullptr);
             return false;
@@ -193,16 +251,22 @@ ExitStatus CommandLineJob::run(Progress &progress)
     runner.stopWhen([&] { return isReaderGone() || isTooLarge(report); });
     if (const Output *output = streamedOutput(job_)) {
         if (const auto status = runIntoOutput(runner, report, *output, progress)) {
-            return status_ = *status;
+            return status_ = withNotes(*status);
         }
     }
-    const auto error = runner.run(report);
+    const auto error = make(runner, report, nullptr);
     progress.finish();
     status_ = madeStatus(report, error);
     if (status_ == exitDone) {
         status_ = writeOutputs(report, job_.outputs, progress, command_.quiet);
     }
-    return status_;
+    return status_ = withNotes(status_);
+}
+
+/// A status of a report that is good is that of its notes.
+ExitStatus CommandLineJob::withNotes(ExitStatus status) const
+{
+    return status == exitDone && !areNotesWritten_ ? exitOutput : status;
 }
 
 } // namespace kareport

@@ -32,6 +32,11 @@ private:
     ExitStatus madeStatus(const UReportDoc &report, const std::optional<InputError> &error);
     std::optional<ExitStatus> runIntoOutput(JobRunner &runner, UReportDoc &report, const Output &output,
                                             Progress &progress);
+    std::optional<InputError> make(JobRunner &runner, UReportDoc &report, ReportTextWriter *stream);
+    void sayNotes(const JobNotes &notes);
+    ExitStatus withNotes(ExitStatus status) const;
+    bool writeNotes(const JobNotes &notes);
+    QString notesFile() const;
     void takeOutputs(std::optional<OutputKind> kindOtherwise);
     void checkOutputs();
     ExitStatus checkSize();
@@ -45,6 +50,7 @@ private:
     Job job_;
     std::optional<qint64> limit_; ///< bytes that neither the text nor an output may exceed
     ExitStatus status_ = exitDone;
+    bool areNotesWritten_ = true;
 };
 
 } // namespace kareport

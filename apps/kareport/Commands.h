@@ -1,5 +1,6 @@
 #pragma once
 
+#include "DataOptions.h"
 #include "Job.h"
 #include "Printing.h"
 
@@ -24,15 +25,18 @@ enum ExitStatus
 /// `kareport render`
 struct RenderCommand
 {
-    QStringList jobs;             ///< job files
+    QStringList jobs;             ///< job files; "-" for one on standard input
     QString jobList;              ///< a file that names job files; "-" for standard input, empty for none
     std::optional<QString> slice; ///< "3/8" for the third of eight parts of all these jobs; none for all of them
     bool onlyOutdated = false;    ///< leave jobs out whose outputs are up to date
     TemplateJob templateJob;      ///< the short form: no job file
+    DataOptions dataOptions;      ///< of the short form
     QStringList outputs;
     QString as;
     QStringList sets;
     std::optional<QString> limit; ///< "10M" for the size that no output may exceed
+    bool strict = false;          ///< notes are errors
+    std::optional<QString> notes; ///< a file that notes are written to, as JSON
     bool progress = false;
     bool quiet = false;
 
@@ -47,6 +51,7 @@ struct RenderCommand
 private:
     bool isShort() const;
     std::optional<QString> wrongSource() const;
+    Expected<JsonSource> readSource() const;
     std::optional<QString> wrongOutputs() const;
 };
 

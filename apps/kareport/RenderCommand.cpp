@@ -14,9 +14,9 @@ namespace kareport
 
 bool RenderCommand::isShort() const
 {
-    const auto &[templateFile, templateName, table, block, data] = templateJob;
-    return !templateFile.isEmpty() || !templateName.isEmpty() || !table.isEmpty() || !block.isEmpty() ||
-           !data.isEmpty();
+    const TemplateJob &job = templateJob;
+    return !job.templateFile.isEmpty() || !job.templateName.isEmpty() || !job.table.isEmpty() || !job.block.isEmpty() ||
+           !job.data.isEmpty() || !dataOptions.isEmpty();
 }
 
 bool RenderCommand::isBatch() const
@@ -36,14 +36,20 @@ std::optional<QString> RenderCommand::usageError() const
 
 std::optional<QString> RenderCommand::wrongSource() const
 {
-    const auto &[templateFile, templateName, table, block, data] = templateJob;
+    const TemplateJob &job = templateJob;
     if ((jobs.isEmpty() && jobList.isEmpty()) != isShort()) {
         return Xlate("either job files or --template, --name, --table or --block, and --data were expected");
     }
-    if (isShort() &&
-        (templateFile.isEmpty() || templateName.isEmpty() || data.isEmpty() || table.isEmpty() == block.isEmpty()))
+    if (isShort() && (job.templateFile.isEmpty() || job.templateName.isEmpty() || job.data.isEmpty() ||
+                      job.table.isEmpty() == job.block.isEmpty()))
     {
         return Xlate("--template, --name, --data and one of --table and --block were expected");
+    }
+    if (const auto wrong = dataOptions.usageError()) {
+        return wrong;
+    }
+    if (jobs.contains(QStringLiteral("-")) && jobList == u"-") {
+        return Xlate("standard input is the list of jobs: no job is read from it");
     }
     if (isShort() && slice) {
         return Xlate("--slice takes a part of several job files: these were expected");
@@ -66,7 +72,28 @@ std::optional<QString> RenderCommand::wrongOutputs() const
                 .arg(file);
         }
     }
+    if (notes && (notes->isEmpty() || *notes == u"-")) {
+        return Xlate("--notes \"%1\": the name of a file was expected").arg(*notes);
+    }
+    if (notes && isBatch() && !notes->contains(QStringLiteral("{}"))) {
+        return Xlate("--notes \"%1\" is one file for several jobs: a name with {} was expected, which stands for the "
+                     "name of the job file")
+            .arg(*notes);
+    }
     return std::nullopt;
+}
+
+/// The job file, or what the short form stands for.
+Expected<JsonSource> RenderCommand::readSource() const
+{
+    if (!isShort()) {
+        return JsonSource::read(jobs.first());
+    }
+    TemplateJob job = templateJob;
+    job.dataOptions = dataOptions.toJson();
+    JsonSource source = JsonSource::fromObject(job.toJson());
+    dataOptions.nameIn(source, QStringLiteral("data.data"));
+    return source;
 }
 
 ExitStatus RenderCommand::run(int &argc, char **argv) const
@@ -86,8 +113,7 @@ ExitStatus RenderCommand::run(int &argc, char **argv) const
         batch.keep(all, jobList);
         return batch.run(slice ? JobSlice::fromText(*slice)->of(all) : all);
     }
-    CommandLineJob job(*this, isShort() ? Expected<JsonSource>(JsonSource::fromObject(templateJob.toJson()))
-                                        : JsonSource::read(jobs.first()));
+    CommandLineJob job(*this, readSource());
     if (job.status() != exitDone) {
         return job.status();
     }

@@ -31,9 +31,77 @@ QString text(const std::string &value)
     return QString::fromLocal8Bit(value.data(), static_cast<qsizetype>(value.size()));
 }
 
+std::optional<QString> textIfAny(const std::optional<std::string> &value)
+{
+    return value ? std::optional(text(*value)) : std::nullopt;
+}
+
 std::string kindNames()
 {
     return kareport::outputKindNames().toStdString();
+}
+
+/// What the options about the data of the short form are read into.
+struct DataWords
+{
+    std::optional<std::string> delimiter;
+    std::vector<std::string> columns;
+    std::optional<std::string> order;
+    std::vector<std::string> units;
+    std::optional<std::string> decimal;
+    std::optional<std::string> thousands;
+    std::optional<std::string> encoding;
+    std::optional<std::string> comment;
+    std::optional<int> skip;
+    bool hasNoHeader = false;
+    bool skipsBlankLines = false;
+
+    kareport::DataOptions options() const
+    {
+        return {textIfAny(delimiter), texts(columns),      textIfAny(order),   texts(units), textIfAny(decimal),
+                textIfAny(thousands), textIfAny(encoding), textIfAny(comment), skip,         hasNoHeader,
+                skipsBlankLines};
+    }
+};
+
+void addDataOptions(CLI::App &render, DataWords &words)
+{
+    const char *group = "Data of --data";
+    render
+        .add_option("--delimiter", words.delimiter,
+                    "What stands between cells: a character, tab, whitespace, or auto to find it out; a comma "
+                    "otherwise")
+        ->type_name("CHAR")
+        ->group(group);
+    render
+        .add_option("--columns", words.columns,
+                    "Names of the columns in their order, as Number,Northing,-, or columns of variables by name or "
+                    "number, as Elevation=Height,Number=1")
+        ->type_name("LIST")
+        ->allow_extra_args(false)
+        ->group(group);
+    render.add_option("--order", words.order, "The columns in short form, as PNEZD; - passes one over")
+        ->type_name("LETTERS")
+        ->group(group);
+    render.add_option("--units", words.units, "Units of the numbers, as length=usft,angle=dms")
+        ->type_name("LIST")
+        ->allow_extra_args(false)
+        ->group(group);
+    render.add_option("--decimal", words.decimal, "Decimal sign of the numbers, . or ,")
+        ->type_name("CHAR")
+        ->group(group);
+    render.add_option("--thousands", words.thousands, "What stands between groups of three digits")
+        ->type_name("CHAR")
+        ->group(group);
+    render.add_option("--encoding", words.encoding, "utf-8, latin-1, windows-1252 or utf-16")
+        ->type_name("NAME")
+        ->group(group);
+    render.add_option("--comment", words.comment, "Pass over lines that begin with this character")
+        ->type_name("CHAR")
+        ->group(group);
+    render.add_option("--skip", words.skip, "Pass over so many lines at the beginning")->type_name("N")->group(group);
+    render.add_flag("--no-header", words.hasNoHeader, "The first row is data already")->group(group);
+    render.add_flag("--skip-blank-lines", words.skipsBlankLines, "Pass over blank lines")->group(group);
 }
 
 /// What the options of `kareport render` are read into.
@@ -52,6 +120,9 @@ struct RenderOptions
     std::string as;
     std::vector<std::string> sets;
     std::optional<std::string> limit;
+    bool strict = false;
+    std::optional<std::string> notes;
+    DataWords dataWords;
     bool progress = false;
     bool quiet = false;
 
@@ -59,13 +130,16 @@ struct RenderOptions
     {
         return {texts(jobs),
                 text(jobList),
-                slice ? std::optional(text(*slice)) : std::nullopt,
+                textIfAny(slice),
                 onlyOutdated,
                 {text(templateFile), text(templateName), text(table), text(block), text(data)},
+                dataWords.options(),
                 texts(outputs),
                 text(as),
                 texts(sets),
-                limit ? std::optional(text(*limit)) : std::nullopt,
+                textIfAny(limit),
+                strict,
+                textIfAny(notes),
                 progress,
                 quiet};
     }
@@ -75,7 +149,8 @@ CLI::App *addRender(CLI::App &program, RenderOptions &options)
 {
     CLI::App *render =
         program.add_subcommand("render", "Make reports from job files, or one from a template and a data file");
-    render->add_option("JOB", options.jobs, "Job file (JSON); several are made one behind the other");
+    render->add_option("JOB", options.jobs,
+                       "Job file (JSON), - for standard input; several are made one after the other");
     render->add_option("--jobs", options.jobList, "File with the name of a job file on each line; - for standard input")
         ->type_name("FILE");
     render
@@ -91,7 +166,10 @@ CLI::App *addRender(CLI::App &program, RenderOptions &options)
         ->type_name("NAME");
     render->add_option("--block", options.block, "Block of the template that the first row is written through")
         ->type_name("NAME");
-    render->add_option("-d,--data", options.data, "Data file (CSV with a header row of variable names)")
+    render
+        ->add_option(
+            "-d,--data", options.data,
+            "Data file (CSV with a header row of variable names, or as the options below say); - for standard input")
         ->type_name("FILE");
     render
         ->add_option("-o,--output", options.outputs,
@@ -109,14 +187,20 @@ CLI::App *addRender(CLI::App &program, RenderOptions &options)
         ->add_option("--limit", options.limit,
                      "Write no report whose text, and no output that, becomes larger, as 20M (K, M, G, or bytes)")
         ->type_name("SIZE");
+    render->add_flag("--strict", options.strict,
+                     "Take it for an error when a column is no variable, or when no column fills a field");
+    render->add_option("--notes", options.notes, "Write what is noted on the data to a file, as JSON")
+        ->type_name("FILE");
     render->add_flag("--progress", options.progress, "Show how far the work has come");
     render->add_flag("--quiet", options.quiet, "Say nothing but errors");
+    addDataOptions(*render, options.dataWords);
     render->footer(
         "Examples:\n"
         "  kareport render stakeout.json\n"
         "  kareport render stakeout.json -o - | less\n"
         "  kareport render stakeout.json --set settings.lengthUnit=usft -o stakeout-ft.rep\n"
         "  kareport render --template survey.xml --name CONTROL --table Points --data points.csv -o points.txt\n"
+        "  total-station | kareport render -t survey.xml -n CONTROL --table Points --data - --order PNEZD\n"
         "  kareport render jobs/*.json -o 'sheets/{}.pdf'\n"
         "  find jobs -name '*.json' | sort | kareport render --jobs - --slice 1/8 --update");
     return render;

@@ -94,6 +94,31 @@ TEST(DeskFrame, OpensWhatItIsGiven)
     }
 }
 
+TEST(DeskFrame, SaysTheNotesOnAReportThatWasMade)
+{
+    Desk desk;
+    const JobFolder folder;
+    folder.put("t.xml", controlTemplates());
+    folder.put("points.csv", "Number,Nort\n1,2\n");
+    const QByteArray job = R"({"header": false, "template": {"file": "t.xml", "name": "CONTROL"},
+        "data": {"p": {"csv": "points.csv"}}, "report": [{"table": "Points", "data": "p"}], "strict": false})";
+    folder.put("job.json", job);
+    EXPECT_TRUE(desk.frame->OpenFile(folder.path("job.json")));
+    ASSERT_EQ(desk.messages.size(), 1);
+    EXPECT_TRUE(desk.messages.front().startsWith(QStringLiteral("The report was made. Notes on its data: 2\n\n")))
+        << desk.messages.front().toStdString();
+    EXPECT_TRUE(desk.messages.front().contains(QStringLiteral("points.csv:1:8: note: the column \"Nort\"")))
+        << desk.messages.front().toStdString();
+    EXPECT_EQ(Desk::reports().size(), 1U);
+
+    desk.messages.clear();
+    folder.put("strict.json", QByteArray(job).replace("false}", "true}"));
+    EXPECT_FALSE(desk.frame->OpenFile(folder.path("strict.json")));
+    ASSERT_EQ(desk.messages.size(), 1);
+    EXPECT_TRUE(desk.messages.front().contains(QStringLiteral("points.csv:1:8: error: the column \"Nort\"")));
+    EXPECT_EQ(Desk::reports().size(), 1U) << "nothing half made stays";
+}
+
 TEST(DeskFrame, AJobRunsIntoAReportWindow)
 {
     Desk desk;

@@ -157,8 +157,9 @@ TEST(JobReaderError, OfData)
     constexpr Row rows[] = {
         {R"({"report": [], "data": @[]})", "an object was expected", "wrong type"},
         {R"({"report": [], "data": {"p": @"p.csv"}})", "an object was expected", "wrong type of a set"},
-        {R"({"report": [], "data": {"p": @{}}})", "either \"csv\" or \"values\"", "neither of the two"},
-        {R"({"report": [], "data": {"p": @{"csv": "p.csv", "values": []}}})", "either \"csv\" or \"values\"", "both"},
+        {R"({"report": [], "data": {"p": @{}}})", "one of the keys csv, values, sqlite", "none of them"},
+        {R"({"report": [], "data": {"p": @{"csv": "p.csv", "values": []}}})", "only one of the keys csv, values was",
+         "two"},
         {R"({"report": [], "data": {"p": {"csv": "p.csv", @"separator": ";"}}})", "\"separator\"", "unknown key"},
         {R"({"report": [], "data": {"p": {"csv": @5}}})", "a text was expected", "wrong type"},
         {R"({"report": [], "data": {"p": {"values": @5}}})", "an object or a list of objects", "wrong type"},
@@ -178,6 +179,52 @@ TEST(JobReaderError, OfData)
         {R"({"report": [], "data": {"p": {"values": [], "units": {"angle": @5}}}})", "a text was expected", "type"},
         {"{\"report\": [],\n \"data\": {\"a\": {\"values\": []},\n  \"b\": {\"values\": [],\n   @\"csw\": \"\"}}}",
          "\"csw\"", "in the second set, lines below"},
+    };
+    expectErrors(rows);
+}
+
+TEST(JobReaderError, OfTheKindsOfData)
+{
+    constexpr Row rows[] = {
+        {R"({"report": [], "data": {"p": {"csv": "p", "delimiter": @"tab"}}})", "whitespace, auto", "no such word"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "header": @"no"}}})", "true or false", "wrong type"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "columns": @[]}}})", "in their order", "no column"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "columns": ["A", @5]}}})", "a text", "a number for a name"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "columns": @"A"}}})", "an object", "wrong type"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "columns": {"A": @0}}}})", "from 1", "columns begin with 1"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "columns": {"A": @""}}}})", "the name of a column", "empty"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "columns": {"A": @null}}}})", "the name of a column", "null"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "order": @"PNEX"}}})", "PNEZD", "no such letter"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "order": @""}}})", "PNEZD", "no letter"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "columns": ["A"], "order": @"P"}}})", "either", "named twice"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "encoding": @"UTF-8"}}})", "utf-8, latin-1", "case matters"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "decimal": @";"}}})", "\".\", \",\"", "no decimal sign"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "thousands": @"."}}})", "not the decimal sign", "is one"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "thousands": @"5"}}})", "neither a digit", "is a digit"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "thousands": @""}}})", "one character", "none"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "skip": @-1}}})", "a whole number from 0", "below 0"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "comment": @"//"}}})", "one ASCII character", "two"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "skipBlankLines": @1}}})", "true or false", "wrong type"},
+        {R"({"report": [], "data": {"p": {"csv": "p", @"encodign": "utf-8"}}})", "did you mean \"encoding\"?",
+         "misspelt"},
+        {R"({"report": [], "data": {"p": {"csv": "p", @"query": "SELECT 1"}}})", "unknown key \"query\"",
+         "a key of another kind"},
+        {R"({"report": [], "data": {"p": @{"sqlite": "p"}}})", "either \"table\" or \"query\"", "neither"},
+        {R"({"report": [], "data": {"p": @{"sqlite": "p", "table": "a", "query": "b"}}})", "either \"table\"", "both"},
+        {R"({"report": [], "data": {"p": {"sqlite": "p", "table": @5}}})", "a text", "wrong type"},
+        {R"({"report": [], "data": {"p": {"sqlite": "p", "table": "a", @"delimiter": ";"}}})", "unknown key",
+         "no text"},
+        {R"({"report": [], "data": {"p": {"sqlite": @"p\u0000.db", "table": "a"}}})", "a character 0", "cut"},
+        {R"({"report": [], "data": {"p": @{"postgresql": ""}}})", "\"query\"", "no query"},
+        {R"({"report": [], "data": {"p": {"postgresql": "", "query": "SELECT $1", "parameters": @5}}})", "a list",
+         "type"},
+        {R"({"report": [], "data": {"p": {"postgresql": "", "query": "SELECT $1", "parameters": [@[]]}}})",
+         "true, false or null", "a list for a value"},
+        {R"({"report": [], "data": {"p": {"postgresql": "", "query": "SELECT 1", @"table": "t"}}})", "unknown key",
+         "none"},
+        {R"({"report": [], "data": {"p": {"json": @5}}})", "a text", "wrong type"},
+        {R"({"report": [], "data": {"p": {"json": "p", "columns": @[]}}})", "an object", "keys have no order"},
+        {R"({"report": [], "strict": @"yes"})", "true or false", "wrong type"},
     };
     expectErrors(rows);
 }

@@ -1,4 +1,5 @@
 #include "JobReader.h"
+#include "DataKind.h"
 
 #include "JobFolder.h"
 
@@ -175,6 +176,12 @@ TEST(JobReader, AStyleIsAnyNumberOf32Bits)
     EXPECT_EQ(std::get<Job::Line>(job.steps[1].action).style, -2147483647 - 1);
 }
 
+/// The files of a data set.
+QString filesOf(const Job &job, const char *set)
+{
+    return job.data[QString::fromUtf8(set)].source->files().join(u' ');
+}
+
 TEST(JobReader, PathsAreRelativeToTheJobFile)
 {
     const QString elsewhere = QDir::rootPath() + QStringLiteral("other/p.csv");
@@ -191,11 +198,9 @@ TEST(JobReader, PathsAreRelativeToTheJobFile)
     EXPECT_EQ(job.outputs[3].file, folder + QStringLiteral("/c"));
     EXPECT_EQ(job.outputs[3].kind, OutputKind::Text);
     EXPECT_EQ(job.outputs[4].kind, OutputKind::Report) << "what is said wins over the ending";
-    EXPECT_EQ(job.data[QStringLiteral("near")].csv, folder + QStringLiteral("/in/p.csv"));
-    EXPECT_EQ(job.data[QStringLiteral("near")].delimiter, ',');
-    EXPECT_EQ(job.data[QStringLiteral("far")].csv, elsewhere);
-    EXPECT_EQ(job.data[QStringLiteral("far")].delimiter, '\t');
-    EXPECT_EQ(job.data[QStringLiteral("here")].csv, QString());
+    EXPECT_EQ(filesOf(job, "near"), folder + QStringLiteral("/in/p.csv"));
+    EXPECT_EQ(filesOf(job, "far"), elsewhere);
+    EXPECT_EQ(filesOf(job, "here"), QString());
 }
 
 } // namespace

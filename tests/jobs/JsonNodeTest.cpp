@@ -161,7 +161,7 @@ TEST(JsonNode, AnUnknownKeyFailsWhereTheKeyStands)
     EXPECT_FALSE(error.has_value());
     JsonNode(source, error)[QStringLiteral("colour")].allowOnly({"red", "green"});
     EXPECT_EQ(placeText(error), marked.place);
-    EXPECT_EQ(error->text, QStringLiteral("unknown key \"rad\": red, green expected"));
+    EXPECT_EQ(error->text, QStringLiteral("unknown key \"rad\": red, green expected; did you mean \"red\"?"));
 }
 
 TEST(JsonNode, WhatIsMissingIsMissedWhereItsParentStands)

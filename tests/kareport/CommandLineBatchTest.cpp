@@ -44,16 +44,6 @@ public:
     }
 };
 
-ProgramRun runWithInput(const QString &folder, const QStringList &arguments, const QByteArray &input)
-{
-    QProcess process;
-    process.setWorkingDirectory(folder);
-    process.start(QStringLiteral(KAREPORT_PROGRAM), arguments);
-    process.write(input);
-    process.closeWriteChannel();
-    return endOf(process);
-}
-
 TEST(CommandLineBatch, EveryJobIsMade)
 {
     struct Row

@@ -28,6 +28,16 @@ ProgramRun runProgram(const QString &folder, const QStringList &arguments,
     return endOf(process);
 }
 
+ProgramRun runWithInput(const QString &folder, const QStringList &arguments, const QByteArray &input)
+{
+    QProcess process;
+    process.setWorkingDirectory(folder);
+    process.start(QStringLiteral(KAREPORT_PROGRAM), arguments);
+    process.write(input);
+    process.closeWriteChannel();
+    return endOf(process);
+}
+
 QStringList words(const char *line)
 {
     return QString::fromUtf8(line).split(u' ', Qt::SkipEmptyParts);

@@ -28,6 +28,9 @@ ProgramRun endOf(QProcess &process);
 ProgramRun runProgram(const QString &folder, const QStringList &arguments,
                       const std::initializer_list<std::pair<const char *, const char *>> &variables = {});
 
+/// The same with bytes on standard input.
+ProgramRun runWithInput(const QString &folder, const QStringList &arguments, const QByteArray &input);
+
 /// The words of a command line.
 QStringList words(const char *line);
 

@@ -42,7 +42,9 @@ void TestJob::runWhole(const QByteArray &json)
     const auto &job = std::get<kareport::Job>(read);
     report_ = std::make_unique<UReportDoc>(kareport::surroundingsOf(job));
     kareport::Progress progress(false);
-    error = kareport::JobRunner(job, std::get<kareport::JsonSource>(source), progress).run(*report_);
+    kareport::JobRunner runner(job, std::get<kareport::JsonSource>(source), progress);
+    error = runner.run(*report_);
+    notes = runner.notes();
 }
 
 QString TestJob::text()

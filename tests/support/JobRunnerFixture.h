@@ -41,6 +41,7 @@ private:
 public:
     JobFolder folder;
     std::optional<kareport::InputError> error;
+    kareport::JobNotes notes;
 
 private:
     std::unique_ptr<UReportDoc> report_;

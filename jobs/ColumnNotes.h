@@ -1,0 +1,49 @@
+#pragma once
+
+#include "DataRemarks.h"
+#include "JobNotes.h"
+#include "RowList.h"
+#include "sXmlReportDictionary.h"
+#include "sXmlReportField.h"
+
+#include <QString>
+#include <QStringList>
+
+#include <optional>
+#include <vector>
+
+namespace kareport
+{
+
+/// Where the steps of a job put their notes.
+struct StepNotes
+{
+    JobNotes &notes;
+    bool isStrict;              ///< a note is an error
+    const DataRemarks &remarks; ///< on the table that was written last
+
+    /// @return the first of these notes, when it is an error
+    std::optional<InputError> add(const std::vector<JobNote> &found) const;
+};
+
+/// A field that shows nothing of any row.
+struct UnfilledField
+{
+    QString variable;
+    QString question; ///< which column may have been meant, as a question; empty for none
+};
+
+/// The names of the variables of a dictionary, in its order.
+QStringList variableNames(const sXmlReportDictionary &dictionary);
+
+/// Notes on the columns that are no variable of a dictionary.
+std::vector<JobNote> unknownColumns(const SourceColumns &columns, const sXmlReportDictionary &dictionary);
+
+/// The keys of the units that numbers of the data are taken to be in, as nobody has said them.
+QStringList assumedUnits(const SourceColumns &columns, const sXmlReportDictionary &dictionary, const DataUnits &units);
+
+/// The fields of a table or block whose variable is read from no column, each variable once.
+std::vector<UnfilledField> unfilledFields(const SourceColumns &columns, const sXmlReportFields &fields,
+                                          const sXmlReportDictionary &dictionary);
+
+} // namespace kareport

@@ -1,0 +1,128 @@
+#include "CsvOptions.h"
+
+#include "ColumnChoices.h"
+#include "Xlate.h"
+
+namespace kareport
+{
+
+namespace
+{
+
+constexpr int mostSkipped = 1'000'000; ///< lines before the header row
+
+/// One ASCII character that is none of quotes and line ends, which a row has anyway. @return 0 after failing the node
+char readMark(const JsonNode &node, const QString &expected)
+{
+    const QString text = node.text();
+    if (text.size() != 1 || text[0].unicode() > 127 || text[0].isNull() || QStringLiteral("\"\r\n").contains(text[0])) {
+        node.fail(expected);
+        return '\0';
+    }
+    return text[0].toLatin1();
+}
+
+/// Names of columns in their order, or an object that maps variables to columns.
+void readColumns(const JsonNode &node, CsvDialect &dialect)
+{
+    if (!node.value().isArray()) {
+        dialect.columns = readColumnChoices(node);
+        return;
+    }
+    if (node.size() == 0) {
+        node.fail(Xlate("the names of the columns in their order were expected"));
+    }
+    for (qsizetype i = 0; i < node.size(); ++i) {
+        const JsonNode name = node[i];
+        dialect.names.append(name.value().isNull() ? QString() : name.text());
+        if (dialect.names.last() == u"-") {
+            dialect.names.last().clear();
+        }
+    }
+}
+
+void readNumberStyle(const JsonNode &set, NumberStyle &style)
+{
+    if (const JsonNode decimal = set[QStringLiteral("decimal")]; decimal.exists()) {
+        style.decimal = decimal.text() == u"," ? ',' : '.';
+        if (style.decimal == '.' && decimal.text() != u".") {
+            decimal.fail(Xlate("one of %1 was expected").arg(QStringLiteral("\".\", \",\"")));
+        }
+    }
+    const JsonNode thousands = set[QStringLiteral("thousands")];
+    if (!thousands.exists()) {
+        return;
+    }
+    const QString text = thousands.text();
+    const QString taken = QStringLiteral("0123456789+-\"\r\n") + QLatin1Char(style.decimal);
+    if (text.toUcs4().size() != 1 || text[0].isLetter() || text[0].isNull() || taken.contains(text[0])) {
+        thousands.fail(
+            Xlate("one character that is neither a digit, a letter nor a sign, and not the decimal sign, was "
+                  "expected"));
+    }
+    style.thousands = text.toStdString();
+}
+
+} // namespace
+
+void readDelimiter(const JsonNode &node, CsvDialect &dialect)
+{
+    if (!node.exists()) {
+        return;
+    }
+    if (node.isText() && node.text() == u"whitespace") {
+        dialect.kind = DelimiterKind::Whitespace;
+    } else if (node.isText() && node.text() == u"auto") {
+        dialect.kind = DelimiterKind::Automatic;
+    } else {
+        dialect.delimiter = readMark(
+            node,
+            Xlate("a text of one ASCII character that is neither a quote nor a line end, or one of %1, was expected")
+                .arg(QStringLiteral("whitespace, auto")));
+    }
+}
+
+CsvDialect readCsvDialect(const JsonNode &set)
+{
+    CsvDialect dialect;
+    readDelimiter(set[QStringLiteral("delimiter")], dialect);
+    dialect.hasHeader = set[QStringLiteral("header")].boolean(true);
+    readColumns(set[QStringLiteral("columns")], dialect);
+    if (const JsonNode order = set[QStringLiteral("order")]; order.exists()) {
+        dialect.order = order.text();
+        if (!namesOfOrder(dialect.order)) {
+            order.fail(Xlate("an order of columns such as PNEZD was expected: each of the letters P, N, E, Z and D at "
+                             "most once, and - for a column that is passed over"));
+        } else if (!dialect.names.isEmpty()) {
+            order.fail(Xlate("the columns have names already: either an order or a list of columns was expected"));
+        }
+    }
+    if (const JsonNode encoding = set[QStringLiteral("encoding")]; encoding.exists()) {
+        if (const auto known = textEncodingFromKey(encoding.text())) {
+            dialect.encoding = *known;
+        } else {
+            encoding.fail(Xlate("one of %1 was expected").arg(QStringLiteral("utf-8, latin-1, windows-1252, utf-16")));
+        }
+    }
+    readNumberStyle(set, dialect.numbers);
+    dialect.skip = set[QStringLiteral("skip")].whole(0, 0, mostSkipped);
+    if (const JsonNode comment = set[QStringLiteral("comment")]; comment.exists()) {
+        dialect.comment = readMark(
+            comment, Xlate("a text of one ASCII character that is neither a quote nor a line end was expected"));
+    }
+    dialect.passesBlankLines = set[QStringLiteral("skipBlankLines")].boolean(false);
+    return dialect;
+}
+
+QStringList csvDialectKeys()
+{
+    QStringList keys;
+    for (const char *key : {"delimiter", "header", "columns", "order", "encoding", "decimal", "thousands", "skip",
+                            "comment", "skipBlankLines"})
+    {
+        keys.append(QLatin1StringView(key));
+    }
+    return keys;
+}
+
+} // namespace kareport

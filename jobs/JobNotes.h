@@ -1,0 +1,56 @@
+#pragma once
+
+#include "InputError.h"
+
+#include <QByteArray>
+#include <QString>
+
+#include <unordered_set>
+#include <vector>
+
+namespace kareport
+{
+
+/// What somebody should know of a report that is made all the same: something of the data or the template that does not
+/// come together.
+struct JobNote
+{
+    enum class Kind
+    {
+        UnknownColumn, ///< a column that is no variable, so that nobody reads it
+        UnfilledField, ///< a field whose variable is in no column, so that it shows nothing or zero
+        WideValue,     ///< values wider than their column
+        MissingValue,  ///< values that are not there and show as 0
+        AssumedUnit ///< a unit of the data that nobody has said: for the file of notes alone, no reason to say anything
+    };
+    Kind kind;
+    InputError about;     ///< the place and the text
+    qint64 line = 0;      ///< of the report, from 1; 0 for none
+    quint64 values = 0;   ///< how many values are meant; 0 for none
+    quint64 firstRow = 0; ///< of the data as it is printed, from 1; 0 for none
+
+    /// Whether somebody has to look at it: it is said, and is an error in a strict job.
+    bool isToBeSaid() const { return kind != Kind::AssumedUnit; }
+    /// "file:line:column: note: text", without the parts that are not known.
+    QString message() const;
+};
+
+/// The notes on a report, each once.
+class JobNotes
+{
+public:
+    /// Adds a note, unless it is there already.
+    void add(const JobNote &note);
+    const std::vector<JobNote> &all() const { return notes_; }
+    /// Those that are to be said.
+    std::vector<JobNote> said() const;
+    /// A JSON list of the notes as objects with "kind", "file", "line", "column", "text", and for values "count", "row"
+    /// and "reportLine", in UTF-8.
+    QByteArray toJson() const;
+
+private:
+    std::vector<JobNote> notes_;
+    std::unordered_set<QString> messages_;
+};
+
+} // namespace kareport

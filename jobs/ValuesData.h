@@ -1,0 +1,11 @@
+#pragma once
+
+#include "DataKind.h"
+
+namespace kareport
+{
+
+/// Data sets with the key "values": their rows stand in the job.
+DataKind valuesDataKind();
+
+} // namespace kareport

@@ -1,0 +1,221 @@
+#include "JobNotes.h"
+
+#include "GeoPackageFile.h"
+#include "JobRunnerFixture.h"
+
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
+#include <QRegularExpression>
+
+#include <gtest/gtest.h>
+
+namespace
+{
+
+using jobs::templateJob;
+using jobs::TestJob;
+
+/// The notes of a job, without the folder of its files.
+std::string notesOf(const TestJob &job)
+{
+    QStringList notes;
+    for (const kareport::JobNote &note : job.notes.said()) {
+        notes.append(note.message().remove(job.folder.path() + u'/'));
+    }
+    return notes.join(u'\n').toStdString();
+}
+
+void putData(const TestJob &job)
+{
+    job.folder.put("good.csv", "Number,Northing\n1,12.5\n");
+    job.folder.put("misspelt.csv", "Number,Nrothing\n1,12.5\n");
+    job.folder.put("wide.csv", "Number,Northing\n123456,1\n");
+    job.folder.put("more.csv", "Number,Northing,\"Code\"\n1,12.5,x\n");
+    job.folder.put("points.json",
+                   "[{\"Number\": 1,\n  \"Code\": 5, \"Northing\": 1},\n {\"Number\": 2, \"Northing\": 2}]");
+    geo::runSql(job.folder.path("points.db"), "CREATE TABLE points (Number TEXT, Code TEXT, Northing REAL)");
+}
+
+/// The step that a job of `runStep` has stands here in its line.
+const char *const tableStep = R"({"table": "Points", "data": "p"})";
+
+TEST(JobNotes, SayWhatDoesNotComeTogether)
+{
+    struct Row
+    {
+        const char *set;
+        const char *step;
+        const char *expected;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {R"("csv": "good.csv")", tableStep, "", "all fits"},
+        {R"("csv": "misspelt.csv")", tableStep,
+         "misspelt.csv:1:8: note: the column \"Nrothing\" is no variable of the dictionary \"Survey\": did you mean "
+         "\"Northing\"?\n"
+         "job.json:1:#: note: no column fills the field \"Northing\" of the table \"Points\": did you mean "
+         "\"Nrothing\"?",
+         "a misspelt column: its rows show 0"},
+        {R"("csv": "more.csv")", tableStep,
+         "more.csv:1:17: note: the column \"Code\" is no variable of the dictionary \"Survey\"", "one more column"},
+        {R"("csv": "more.csv")", R"({"table": "Points", "data": "p"}, {"table": "Sorted", "data": "p"})",
+         "more.csv:1:17: note: the column \"Code\" is no variable of the dictionary \"Survey\"", "said once"},
+        {R"("csv": "more.csv", "columns": ["Number", "Northing", "Cod"])", tableStep,
+         "more.csv: note: the column \"Cod\" is no variable of the dictionary \"Survey\"", "a name that the job gives"},
+        {R"("values": [{"Number": "1"}, {"Number": "2", "Nortihng": 2}])", tableStep,
+         "job.json:1:#: note: the column \"Nortihng\" is no variable of the dictionary \"Survey\": did you mean "
+         "\"Northing\"?\n"
+         "job.json:1:#: note: no column fills the field \"Northing\" of the table \"Points\": did you mean "
+         "\"Nortihng\"?",
+         "a key of values"},
+        {R"("values": {"Number": "1"})", R"({"block": "Point", "data": "p"})",
+         "job.json:1:#: note: no column fills the field \"Northing\" of the block \"Point\"", "a block"},
+        {R"("values": {"Number": "1", "Northing": null})", R"({"block": "Point", "data": "p"})", "",
+         "a key without a value is one"},
+        {R"("json": "points.json")", tableStep,
+         "points.json:2:3: note: the column \"Code\" is no variable of the dictionary \"Survey\"",
+         "keys that show with the rows"},
+        {R"("sqlite": "points.db", "table": "points")", tableStep,
+         "points.db: note: the column \"Code\" is no variable of the dictionary \"Survey\"", "a database has no place"},
+    };
+    for (const Row &row : rows) {
+        TestJob job;
+        putData(job);
+        job.run(templateJob(QByteArray(R"("p": {)") + row.set + "}", row.step));
+        EXPECT_FALSE(job.error) << row.reason << ": " << job.text().toStdString();
+        QString notes = QString::fromStdString(notesOf(job));
+        notes.replace(QRegularExpression(QStringLiteral("job\\.json:1:\\d+")), QStringLiteral("job.json:1:#"));
+        EXPECT_EQ(notes.toStdString(), row.expected) << row.reason;
+    }
+}
+
+TEST(JobNotes, SayWhichValuesDoNotShowAsTheyAre)
+{
+    struct Row
+    {
+        const char *csv;
+        const char *options;
+        const char *expected;
+        const char *first; ///< what the line of the first such value begins with
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {"Number,Northing\n12345,12345.678\n1,0\n", "", "", "", "all fit to the last character"},
+        {"Number,Northing\n1,2\n123456,3\n1234567,4\n", "",
+         "2 values are wider than the field \"Number\" of the table \"Points\", the first one in row 2, line 5 of the "
+         "report",
+         "123456|", "wider than the column, which keeps them whole"},
+        {"Number,Northing\n1,2\n123456,3\n", R"("options": {"printHash": true}, )",
+         "1 values are wider than the field \"Number\" of the table \"Points\" and show as #, the first one in row 2, "
+         "line 5 of the report",
+         "#####|", "replaced"},
+        {"Number,Northing\n123456,2\n", R"("options": {"excel": true}, )", "", "",
+         "a spreadsheet has no columns to fit"},
+        {"Number,Northing\n1,\n2,5\n,\n", "",
+         "2 values of the field \"Northing\" of the table \"Points\" are missing and show as 0, the first one in row 1, "
+         "line 4 of the report",
+         "1    |", "a missing text shows as none and is no reason"},
+        {"Number,Northing\n1,\n", R"("options": {"zeroBlank": true}, )", "", "", "blanks are no elevation"},
+    };
+    for (const Row &row : rows) {
+        TestJob job;
+        job.folder.put("p.csv", row.csv);
+        job.run(
+            templateJob(R"("p": {"csv": "p.csv"})", R"({"line": "x"}, {"table": "Points", "data": "p"})", row.options));
+        EXPECT_FALSE(job.error) << row.reason;
+        QString notes = QString::fromStdString(notesOf(job));
+        notes.remove(QRegularExpression(QStringLiteral("job\\.json:1:\\d+: note: ")));
+        EXPECT_EQ(notes.toStdString(), row.expected) << row.reason;
+        if (!job.notes.said().empty()) {
+            const kareport::JobNote note = job.notes.said().front();
+            EXPECT_TRUE(job.text()
+                            .section(u'\n', int(note.line) - 1, int(note.line) - 1)
+                            .startsWith(QLatin1StringView(row.first)))
+                << row.reason << "\n"
+                << job.text().toStdString();
+        }
+    }
+}
+
+TEST(JobNotes, AreErrorsInAStrictJob)
+{
+    struct Row
+    {
+        const char *set;
+        bool isWrong;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {R"("csv": "good.csv")", false, "nothing to note"},
+        {R"("csv": "misspelt.csv")", true, "known before the rows are read"},
+        {R"("json": "points.json")", true, "known after them"},
+        {R"("csv": "wide.csv")", true, "a value that does not fit"},
+    };
+    for (const Row &row : rows) {
+        for (const bool isStrict : {true, false}) {
+            TestJob job;
+            putData(job);
+            job.run(templateJob(QByteArray(R"("p": {)") + row.set + "}", tableStep,
+                                isStrict ? "\"strict\": true, " : "\"strict\": false, "));
+            EXPECT_EQ(job.error.has_value(), row.isWrong && isStrict) << row.reason;
+            if (job.error) {
+                EXPECT_EQ(job.error->message(), job.notes.said().front().about.message()) << row.reason;
+            }
+        }
+    }
+}
+
+TEST(JobNotes, NameTheUnitsThatNobodySaid)
+{
+    struct Row
+    {
+        const char *units;
+        const char *expected;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {"", "m2 deg", "both defaults"},
+        {R"(, "units": {"length": "m"})", "m2 deg", "a unit that no number has"},
+        {R"(, "units": {"area": "m2"})", "deg", "the default itself may be said"},
+        {R"(, "units": {"area": "ha", "angle": "dms"})", "", "all are said"},
+    };
+    for (const Row &row : rows) {
+        TestJob job;
+        job.run(templateJob(QByteArray(R"("s": {"values": {"Client": "C", "Area": 1, "Bearing": "N45-0-0E"})") +
+                                row.units + "}",
+                            R"({"block": "Site", "data": "s"})", "\"strict\": true, "));
+        EXPECT_FALSE(job.error) << row.reason << ": no reason for an error";
+        QStringList keys;
+        for (const kareport::JobNote &note : job.notes.all()) {
+            EXPECT_FALSE(note.isToBeSaid()) << row.reason;
+            keys.append(note.about.text.section(QStringLiteral(": "), 1).section(u' ', 0, 0));
+        }
+        EXPECT_EQ(keys.join(u' ').toStdString(), row.expected) << row.reason;
+    }
+}
+
+TEST(JobNotes, AreWrittenAsJson)
+{
+    kareport::JobNotes notes;
+    EXPECT_EQ(notes.toJson().simplified(), "[ ]");
+    const kareport::JobNote note = {
+        kareport::JobNote::Kind::UnknownColumn,
+        {QStringLiteral("p.csv"), kareport::TextPlace{3, 7}, QStringLiteral("Gr\u00F6\u00DFe")}};
+    notes.add(note);
+    notes.add(note);
+    notes.add({kareport::JobNote::Kind::UnfilledField, {QStringLiteral("j.json"), std::nullopt, QStringLiteral("b")}});
+    const QJsonArray list = QJsonDocument::fromJson(notes.toJson()).array();
+    ASSERT_EQ(list.size(), 2) << "a note is kept once";
+    const QJsonObject first = list[0].toObject();
+    EXPECT_EQ(first[QStringLiteral("kind")].toString(), QStringLiteral("unknown-column"));
+    EXPECT_EQ(first[QStringLiteral("file")].toString(), QStringLiteral("p.csv"));
+    EXPECT_EQ(first[QStringLiteral("line")].toInt(), 3);
+    EXPECT_EQ(first[QStringLiteral("column")].toInt(), 7);
+    EXPECT_EQ(first[QStringLiteral("text")].toString(), QStringLiteral("Gr\u00F6\u00DFe"));
+    const QJsonObject second = list[1].toObject();
+    EXPECT_EQ(second[QStringLiteral("kind")].toString(), QStringLiteral("unfilled-field"));
+    EXPECT_FALSE(second.contains(QStringLiteral("line"))) << "no place is none";
+}
+
+} // namespace
