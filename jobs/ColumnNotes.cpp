@@ -31,7 +31,7 @@ std::optional<InputError> StepNotes::add(const std::vector<JobNote> &found) cons
     for (const JobNote &note : found) {
         notes.add(note);
     }
-    const auto wrong = std::find_if(found.begin(), found.end(), [](const JobNote &note) { return note.isToBeSaid(); });
+    const auto wrong = std::find_if(found.begin(), found.end(), [](const JobNote &note) { return note.isMistake(); });
     return isStrict && wrong != found.end() ? std::optional(wrong->about) : std::nullopt;
 }
 

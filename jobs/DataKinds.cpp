@@ -2,6 +2,7 @@
 
 #include "CsvData.h"
 #include "JsonData.h"
+#include "LandXmlData.h"
 #include "PostgresData.h"
 #include "SqliteData.h"
 #include "ValuesData.h"
@@ -19,6 +20,7 @@ const std::vector<DataKind> &dataKinds()
         made.push_back(sqliteDataKind());
         made.push_back(postgresDataKind());
         made.push_back(jsonDataKind());
+        made.push_back(landXmlDataKind());
         return made;
     }();
     return kinds;

@@ -19,6 +19,8 @@ QString keyOf(JobNote::Kind kind)
     case JobNote::Kind::UnknownColumn: return QStringLiteral("unknown-column");
     case JobNote::Kind::WideValue: return QStringLiteral("wide-value");
     case JobNote::Kind::MissingValue: return QStringLiteral("missing-value");
+    case JobNote::Kind::Difference: return QStringLiteral("difference");
+    case JobNote::Kind::PassedOver: return QStringLiteral("passed-over");
     case JobNote::Kind::AssumedUnit: return QStringLiteral("assumed-unit");
     case JobNote::Kind::UnfilledField: break;
     }

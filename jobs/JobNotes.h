@@ -21,6 +21,8 @@ struct JobNote
         UnfilledField, ///< a field whose variable is in no column, so that it shows nothing or zero
         WideValue,     ///< values wider than their column
         MissingValue,  ///< values that are not there and show as 0
+        Difference,    ///< what does not fit together in the data itself
+        PassedOver,    ///< what a data file holds and no list reads: said, but no mistake of anybody
         AssumedUnit ///< a unit of the data that nobody has said: for the file of notes alone, no reason to say anything
     };
     Kind kind;
@@ -29,8 +31,10 @@ struct JobNote
     quint64 values = 0;   ///< how many values are meant; 0 for none
     quint64 firstRow = 0; ///< of the data as it is printed, from 1; 0 for none
 
-    /// Whether somebody has to look at it: it is said, and is an error in a strict job.
+    /// Whether somebody has to look at it.
     bool isToBeSaid() const { return kind != Kind::AssumedUnit; }
+    /// Whether it is an error in a strict job.
+    bool isMistake() const { return isToBeSaid() && kind != Kind::PassedOver; }
     /// "file:line:column: note: text", without the parts that are not known.
     QString message() const;
 };

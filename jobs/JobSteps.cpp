@@ -90,6 +90,9 @@ JobSteps::Wrong JobSteps::write(const Job::Block &step, const JsonPath &path)
     if (auto wrong = noteColumns(rows, step.data, *block, Xlate("block"), path)) {
         return wrong;
     }
+    if (auto wrong = noteSource(rows)) {
+        return wrong;
+    }
     if (const UDataObject *object = rows.GetAt(0)) {
         needMemory(report_.WriteDataBlock(step.name, object, step.before, step.after));
         return std::nullopt;
@@ -124,7 +127,12 @@ JobSteps::Wrong JobSteps::write(const Job::Table &step, const JsonPath &path)
     if (auto wrong = noteColumns(rows, step.data, *table, Xlate("table"), path)) {
         return wrong;
     }
-    return isStopped_() ? std::nullopt : noteValues(rows, step.name, path);
+    if (isStopped_()) {
+        return std::nullopt;
+    }
+    auto wrong = noteSource(rows);
+    auto other = noteValues(rows, step.name, path);
+    return wrong ? wrong : other;
 }
 
 JobSteps::Wrong JobSteps::noSuchRecord(const QString &what, const QString &name, const QStringList &names,
@@ -221,6 +229,18 @@ JobSteps::Wrong JobSteps::noteValues(const RowList &rows, const QString &table, 
                          QString::number(column.missing.firstRow), QString::number(column.missing.firstLine)),
                 column.missing);
         }
+    }
+    return wrong;
+}
+
+/// Notes what a source says of itself.
+JobSteps::Wrong JobSteps::noteSource(const RowList &rows)
+{
+    Wrong wrong;
+    for (const InputError &note : rows.notes()) {
+        using Kind = JobNote::Kind;
+        auto one = notes_.add({{note.place ? Kind::Difference : Kind::PassedOver, note}});
+        wrong = wrong ? wrong : one;
     }
     return wrong;
 }

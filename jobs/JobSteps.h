@@ -47,6 +47,7 @@ private:
     template <typename Record>
     Wrong noteColumns(const RowList &rows, const QString &data, const Record &record, const QString &what,
                       const JsonPath &path);
+    Wrong noteSource(const RowList &rows);
     Wrong noteValues(const RowList &rows, const QString &table, const JsonPath &path);
 
     const Job &job_;

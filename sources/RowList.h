@@ -35,6 +35,10 @@ public:
     /// The columns; nothing while they are not known, as those of a source that shows them with its rows are known after the
     /// last one only. Asked when the list has been made and when it has come to its end.
     virtual std::optional<SourceColumns> columns() const { return std::nullopt; }
+
+    /// What there is to say of a source whose rows are sound. One with a place tells what does not fit together in the
+    /// source, one without what the source holds that no list reads. Nothing before the list has come to its end.
+    virtual std::vector<InputError> notes() const { return {}; }
 };
 
 } // namespace kareport

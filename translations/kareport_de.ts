@@ -1987,6 +1987,36 @@
         <translation>für den Schlüssel "%1" ist im Auftrag kein Platz</translation>
     </message>
     <message>
+        <location filename="../jobs/LandXmlData.cpp"/>
+        <source>the file says its units: "length" alone was expected, which lengths of the job are in</source>
+        <translation>die Datei nennt ihre Einheiten: nur „length“ wurde erwartet, die Einheit der Längen im Auftrag</translation>
+    </message>
+    <message>
+        <location filename="../jobs/LandXmlQueryReader.cpp"/>
+        <source>the list "%1" has no use for the key "%2"</source>
+        <translation>die Liste „%1“ kann mit dem Schlüssel „%2“ nichts anfangen</translation>
+    </message>
+    <message>
+        <location filename="../jobs/LandXmlQueryReader.cpp"/>
+        <source>a number from %1 to %2 was expected</source>
+        <translation>eine Zahl von %1 bis %2 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/LandXmlQueryReader.cpp"/>
+        <source>a station such as 12345.678 or "12+345.678" was expected</source>
+        <translation>eine Station wie 12345.678 oder „12+345.678“ wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/LandXmlQueryReader.cpp"/>
+        <source>the key "%1" was expected</source>
+        <translation>der Schlüssel „%1“ wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/LandXmlQueryReader.cpp"/>
+        <source>the key "%1" with one of %2 was expected</source>
+        <translation>der Schlüssel „%1“ mit einem von %2 wurde erwartet</translation>
+    </message>
+    <message>
         <location filename="../jobs/PostgresData.cpp"/>
         <source>a text, a number, true, false or null was expected</source>
         <translation>ein Text, eine Zahl, true, false oder null wurde erwartet</translation>

@@ -1987,6 +1987,36 @@
         <translation>ジョブにはキー "%1" を設定できません</translation>
     </message>
     <message>
+        <location filename="../jobs/LandXmlData.cpp"/>
+        <source>the file says its units: "length" alone was expected, which lengths of the job are in</source>
+        <translation>単位はファイルが示します：ジョブの長さの単位である「length」だけが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/LandXmlQueryReader.cpp"/>
+        <source>the list "%1" has no use for the key "%2"</source>
+        <translation>リスト「%1」ではキー「%2」を使いません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/LandXmlQueryReader.cpp"/>
+        <source>a number from %1 to %2 was expected</source>
+        <translation>%1 から %2 までの数が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/LandXmlQueryReader.cpp"/>
+        <source>a station such as 12345.678 or "12+345.678" was expected</source>
+        <translation>12345.678 または「12+345.678」のような測点が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/LandXmlQueryReader.cpp"/>
+        <source>the key "%1" was expected</source>
+        <translation>キー「%1」が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/LandXmlQueryReader.cpp"/>
+        <source>the key "%1" with one of %2 was expected</source>
+        <translation>%2 のいずれかを値とするキー「%1」が必要です</translation>
+    </message>
+    <message>
         <location filename="../jobs/PostgresData.cpp"/>
         <source>a text, a number, true, false or null was expected</source>
         <translation>文字列、数値、true、false、null のいずれかが必要です</translation>

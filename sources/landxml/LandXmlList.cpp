@@ -178,6 +178,22 @@ std::optional<InputError> LandXmlList::storeValues(UDataObject &object, const st
     return std::nullopt;
 }
 
+std::optional<SourceColumns> LandXmlList::columns() const
+{
+    SourceColumns found;
+    found.source = file_->path();
+    for (const QString &name : names_) {
+        SourceColumn &column = found.columns.emplace_back();
+        column.name = name;
+        column.isOffered = true;
+    }
+    for (const Column &column : columns_) {
+        found.columns[column.variable].isKnown = true;
+        found.ids.push_back(column.parser.id());
+    }
+    return found;
+}
+
 void LandXmlList::Sort(const std::vector<unsigned> &ids)
 {
     if (error_) {

@@ -38,7 +38,9 @@ public:
     std::optional<InputError> error() const override { return error_; }
     /// What there is to say of a file whose rows are sound: what differs, and the kinds of elements that no list reads.
     /// Nothing before the rows have come to their end.
-    std::vector<InputError> notes() const;
+    std::vector<InputError> notes() const override;
+    /// The variables that rows of the query have. All are offered: nobody misses one that is not read.
+    std::optional<SourceColumns> columns() const override;
 
 private:
     struct Column

@@ -29,7 +29,7 @@ TEST(JobDataKinds, AreListedOnce)
         EXPECT_TRUE(kind.read) << kind.key.toStdString();
         keys.append(kind.key);
     }
-    for (const char *key : {"csv", "values", "sqlite", "postgresql", "json"}) {
+    for (const char *key : {"csv", "values", "sqlite", "postgresql", "json", "landxml"}) {
         EXPECT_TRUE(keys.contains(QLatin1StringView(key))) << key;
     }
 }

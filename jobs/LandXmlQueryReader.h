@@ -1,0 +1,18 @@
+#pragma once
+
+#include "JsonNode.h"
+#include "LandXmlQuery.h"
+
+#include <QStringList>
+
+namespace kareport
+{
+
+/// The keys that say what a data set wants of a LandXML file.
+QStringList landXmlQueryKeys();
+
+/// Reads these keys of a data set. What is wrong with one fails the node; one of another list is wrong. The unit of the
+/// lengths is left open.
+LandXmlQuery readLandXmlQuery(const JsonNode &set);
+
+} // namespace kareport
