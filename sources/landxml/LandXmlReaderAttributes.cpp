@@ -1,7 +1,7 @@
 // What the reader takes from the attributes of elements.
 #include "LandXmlReader.h"
 #include "LandXmlTags.h"
-#include "ValueParser.h"
+#include "NumberText.h"
 #include "Xlate.h"
 
 #include <cmath>

@@ -1,7 +1,7 @@
 #include "LandXmlUnits.h"
 
+#include "NumberText.h"
 #include "UnitFactors.h"
-#include "ValueParser.h"
 #include "Xlate.h"
 
 #include <algorithm>
