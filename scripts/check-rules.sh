@@ -16,7 +16,7 @@ report 'Headers are included by their name alone, so that layers hold:' \
     "$(grep -nE '#include "(\.\./|[a-z]+/)' $sources || true)"
 report 'Operating-system headers belong into files named for the system (Posix or Windows in their names):' \
     "$(grep -nE '#include <(unistd|fcntl|sys/[a-z]+|windows|pthread)(\.h)?>' $sources | grep -vE '(Posix|Windows)[A-Za-z]*\.(cpp|h):' || true)"
-report 'A test is not skipped without a reason behind it:' \
+report 'A test is not skipped without a reason:' \
     "$(grep -nE 'GTEST_SKIP\(\);|DISABLED_' $sources || true)"
 report 'No shell is started:' \
     "$(grep -nE '\b(std::)?system\(|\bpopen\(' $sources | grep -v 'QLocale::system()' || true)"

@@ -3,7 +3,7 @@
 #
 #   scripts/packages.sh build|test|docs|package|office|bench|compare|tidy|coverage|tables [...]
 #
-# Every package stands here once, with the reason for it. Nothing is asked of apt when all are installed.
+# Every package is listed once, with the reason for it. apt is not called when all are installed.
 set -euo pipefail
 
 packages_build=(
@@ -66,10 +66,10 @@ packages_compare=(
     parallel                # a batch over processes
 )
 packages_tidy=(
-    clang-tidy
+    clang clang-tidy        # the sources read for mistakes that compile
 )
 packages_coverage=(
-    gcovr
+    gcovr                   # which lines the tests reach
 )
 
 packages_tables=(

@@ -1,5 +1,5 @@
 #!/usr/bin/env bash
-# Makes tests/golden/ anew from the examples. Read the difference before it is committed.
+# Makes tests/golden/ again from the examples. Read the difference before you commit it.
 set -euo pipefail
 cd "$(dirname "$0")/.."
 
