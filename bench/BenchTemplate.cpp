@@ -39,7 +39,7 @@ QByteArray makeTemplates(qint64 count)
     return text;
 }
 
-/// A file of templates in one root, as a parser of XML wants it.
+/// A file of templates in one root, as an XML parser needs it.
 class TemplatesFile
 {
 public:
@@ -72,7 +72,7 @@ void readTemplates(benchmark::State &state, Read read)
     time.report(state, static_cast<double>(file.size()));
 }
 
-/// The last template, behind all others.
+/// The last template, after all others.
 void loadTemplate(benchmark::State &state)
 {
     readTemplates(state, [name = QStringLiteral("t%1").arg(state.range(0) - 1)](const QString &path) {

@@ -17,7 +17,7 @@
 #include <memory>
 #include <vector>
 
-// A report in its view beside the same text in a bare control: what the view adds must stay small, at N and at 10 N.
+// A report in its view compared with the same text in a bare control: what the view adds must stay small, at N and at 10 N.
 
 namespace
 {

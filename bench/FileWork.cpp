@@ -32,7 +32,7 @@ int say(const std::function<bool()> &work)
     return done ? 0 : 1;
 }
 
-/// What stands in a page of a PDF: two bytes for each character, and the commands around a line.
+/// The content of a page of a PDF: two bytes for each character, and the commands around a line.
 QByteArrayList pageContents(const QByteArray &report)
 {
     constexpr qsizetype linesOfPage = 72;

@@ -60,7 +60,7 @@ class Element:
         return self.bearing + self.k0 * s + (self.k1 - self.k0) * s * s / (2.0 * self.length)
 
     def at(self, s):
-        """Northing, easting and bearing s metres behind the start (Simpson's rule, exact to far below 0.1 mm)."""
+        """Northing, easting and bearing s metres from the start (Simpson's rule, exact to far below 0.1 mm)."""
         steps = 2 * max(16, math.ceil(s / 4.0))
         north = east = 0.0
         for i in range(steps + 1):

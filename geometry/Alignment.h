@@ -9,7 +9,7 @@
 namespace kareport
 {
 
-/// Curves one after the other, walked through from start to end. Places on it are told by the distance along it from its
+/// Curves one after the other, walked through from start to end. Places on it are given by the distance along it from its
 /// start.
 class Alignment
 {

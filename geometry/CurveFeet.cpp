@@ -49,7 +49,7 @@ CurveFeet feetOnArc(const PlaneCurve &curve, PlanePoint point)
     return found;
 }
 
-/// Searches a transition for places from which a point is neither ahead nor back. Stretches without one are told by how
+/// Searches a transition for places from which a point is neither ahead nor back. Stretches without one are found by how
 /// fast that can change at most; a stretch along which it only falls or only rises has one or none.
 class TransitionSearch
 {

@@ -13,7 +13,7 @@ using FittedCurve = std::variant<PlaneCurve, CurveFault>;
 /// The line between two points.
 FittedCurve lineBetween(PlanePoint start, PlanePoint end);
 
-/// The arc about a centre that begins at `start` and goes on, to the right or to the left, to the direction of `end`.
+/// The arc about a centre that begins at `start` and continues, to the right or to the left, to the direction of `end`.
 /// A start that is the end as well makes a full circle.
 FittedCurve arcAbout(PlanePoint centre, PlanePoint start, PlanePoint end, bool isRight);
 /// The arc about a centre of a length.

@@ -12,7 +12,7 @@
 namespace kareport
 {
 
-/// Where one is on a curve, and how it goes on there.
+/// Where one is on a curve, and how it continues there.
 struct CurvePlace
 {
     PlanePoint point;

@@ -8,7 +8,7 @@
 namespace kareport
 {
 
-/// A place on an alignment to which a point may be said to belong.
+/// A place on an alignment to which a point may belong.
 struct AlignmentFoot
 {
     enum class Kind

@@ -5,7 +5,7 @@
 namespace kareport
 {
 
-// Differences that lose their digits near 0 when they are written down as they stand.
+// Differences that lose their digits near 0 when they are computed as written.
 
 /// sin x / x
 inline double sineRatio(double x)

@@ -6,7 +6,7 @@
 namespace kareport
 {
 
-/// A place where the count of stations breaks off and goes on with another number.
+/// A place where the count of stations breaks off and continues with another number.
 struct StationEquation
 {
     double internal;           ///< the place, as a station that is counted from the start without equations

@@ -7,7 +7,7 @@ namespace kareport
 ///
 /// Of the first group, the curvature is a function of the length along the curve, and the curve may lead from any radius
 /// to any other. The second group is drawn over its tangent: there the second derivative of the ordinate is a function of
-/// the abscissa, the radius stands in that derivative, and one end is straight.
+/// the abscissa, the radius is part of that derivative, and one end is straight.
 enum class TransitionForm
 {
     Clothoid,    ///< in proportion to the length

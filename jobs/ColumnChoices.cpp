@@ -49,7 +49,7 @@ std::optional<InputError> whyNotOpened(const RowObjectList &rows, const DataRequ
     JsonPath place = request.path;
     place.emplace_back(QStringLiteral("columns"));
     place.emplace_back(fault->choice);
-    // The name of the data stands nowhere in the job's place.
+    // The name of the data is nowhere in the job's place.
     return request.source.errorAt(place, QStringLiteral("%1: %2").arg(error->file, fault->text));
 }
 

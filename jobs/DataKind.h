@@ -23,7 +23,7 @@ namespace kareport
 /// What a data set is opened with.
 struct DataRequest
 {
-    const JsonSource &source; ///< the job, for values that stand in it and for the places of errors
+    const JsonSource &source; ///< the job, for values that are in it and for the places of errors
     JsonPath path;            ///< of the data set in the job
     /// The variables that are wanted, for numbers in the given units.
     std::function<Variables(const DataUnits &)> variablesIn;

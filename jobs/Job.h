@@ -128,7 +128,7 @@ struct TemplateJob
     QString data;                 ///< a CSV file, "-" for standard input
     QJsonObject dataOptions = {}; ///< what else the data set says, such as its delimiter
 
-    /// The content of the job file that it stands for.
+    /// The content of the equivalent job file.
     QJsonObject toJson() const;
 };
 

@@ -56,7 +56,7 @@ std::optional<OutputClash> outputClash(const Job &job, const QString &path)
             return OutputClash{i, source->arg(output.file)};
         }
         const Output *other = earlier.value(identity);
-        // Both reports stand, one after the other, in standard output.
+        // Both reports are written to standard output, one after the other.
         if (other != nullptr && !(other->isStandardOutput() && output.isStandardOutput())) {
             return OutputClash{
                 i, Xlate("\"%1\" is the file of the output \"%2\" already: an output of its own was expected")

@@ -20,13 +20,13 @@ struct OutputClash
 QString outputIdentity(const Output &output);
 
 /// The first output of a job that is the job file, its template or its data, or that another output is already.
-/// @param path  the job file; empty for a job that stands in no file
+/// @param path  the job file; empty for a job that is in no file
 std::optional<OutputClash> outputClash(const Job &job, const QString &path);
 
 /// Whether every output of a job is a file that was written later than all that the job is made of was changed: the job
 /// file, its template file and its data files. A file with the very time of an output counts as changed after it. A job
 /// with standard output among its outputs, or with data that is in no file, is never up to date.
-/// @param path  the job file; empty for a job that stands in no file
+/// @param path  the job file; empty for a job that is in no file
 bool isUpToDate(const Job &job, const QString &path);
 
 } // namespace kareport

@@ -17,7 +17,7 @@ struct JobSlice
 
     /// Reads "3/8", the third of eight. @return nothing for another text, or a number that is not within the count
     static std::optional<JobSlice> fromText(const QString &text);
-    /// Every `count`-th job, beginning with the `number`-th: jobs that stand beside each other are often alike, and go to
+    /// Every `count`-th job, beginning with the `number`-th: neighbouring jobs are often similar, and go to
     /// different slices. The slices of one list have each job once between them; a slice may be empty.
     QStringList of(const QStringList &jobs) const;
 };

@@ -90,7 +90,7 @@ private:
     bool writeTo(QIODevice &device, QString &problem)
     {
         if (report_.HasLostText()) {
-            return false; // half a report is none
+            return false; // half a report counts as none
         }
         switch (output_.kind) {
         case OutputKind::Report: return report_.WriteText(device, LineEnds::ReportFile);
@@ -108,7 +108,7 @@ private:
         RichTextNotes notes;
         std::optional<RichTextError> error;
         {
-            // What this writes must not hang on another output that wants the report in rich-text mode.
+            // What this writes must not depend on another output that needs the report in rich-text mode.
             const auto guard = withoutRichTextMode(report_);
             error = showReportContent(report_, document, &notes);
         }

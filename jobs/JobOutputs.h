@@ -18,7 +18,7 @@ namespace kareport
 struct OutputResult
 {
     std::optional<QString> problem = std::nullopt; ///< a sentence that says what went wrong
-    bool isReaderGone = false;                     ///< nobody reads standard output any more: there is nothing to say
+    bool isReaderGone = false;                     ///< standard output has no reader any more: there is nothing to say
     QStringList warnings = {};                     ///< what a reader of the output should know
 
     bool isWritten() const { return !problem && !isReaderGone; }

@@ -15,8 +15,8 @@ namespace kareport
 {
 
 /// What the report of a job is made in: the job says all of it, so that what is printed does not depend on the preferences,
-/// the printer and the clock of whoever runs it. A job without a time has that of a reproducible build, if one gives it
-/// (SOURCE_DATE_EPOCH), else the host's.
+/// the printer and the clock of the user who runs it. A job without a time has that of a reproducible build, if one
+/// gives it (SOURCE_DATE_EPOCH), else the host's.
 ReportSurroundings surroundingsOf(const Job &job);
 
 /// Makes a report as a job describes it.
@@ -43,7 +43,7 @@ public:
     /// @param stream  receives the text while it is written, where no step takes text back; null keeps it in the report.
     ///                Once it has failed, no more is made
     /// @return what is wrong with the job's template or data; nothing when the report has been made or the work was stopped
-    /// @throws std::bad_alloc when memory ends: half a report is none
+    /// @throws std::bad_alloc when memory runs out: half a report counts as none
     std::optional<InputError> run(UReportDoc &report, ReportTextWriter *stream = nullptr);
 
 private:

@@ -81,7 +81,7 @@ JobSteps::Wrong JobSteps::write(const Job::Block &step, const JsonPath &path)
         return *error;
     }
     RowList &rows = *std::get<std::unique_ptr<RowList>>(opened);
-    // All rows must be good, though only the first one is shown.
+    // All rows must be valid, though only the first one is shown.
     for (std::size_t row = 0; rows.GetAt(row) != nullptr; ++row) {
     }
     if (auto error = rows.error()) {

@@ -26,7 +26,7 @@ public:
     {}
 
     /// @return what is wrong with a step or with its data; nothing when all steps were written or the work was stopped
-    /// @throws std::bad_alloc where the report has lost text: half a report is none
+    /// @throws std::bad_alloc where the report has lost text: half a report counts as none
     std::optional<InputError> write();
 
 private:

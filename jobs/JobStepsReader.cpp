@@ -17,7 +17,7 @@ int readLines(const JsonNode &node, int fallback)
     return node.whole(fallback, -mostLines, mostLines);
 }
 
-/// A line takes any style: one that rich text does not know stands in the plain text alone.
+/// A line takes any style: one that rich text does not know is only in the plain text.
 int readStyle(const JsonNode &node)
 {
     return node.whole(0, std::numeric_limits<int>::min(), std::numeric_limits<int>::max());

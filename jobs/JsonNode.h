@@ -45,7 +45,7 @@ public:
     /// Fails at every key that is not one of these.
     void allowOnly(std::initializer_list<const char *> keys) const;
     void allowOnly(const QStringList &keys) const;
-    /// Says what was expected in the place of the value.
+    /// Says what was expected instead of the value.
     void fail(const QString &text) const { failAt(path_, text, false); }
 
 private:

@@ -20,13 +20,13 @@ using SeeMember = std::function<void(const JsonNode &member, const QString &name
 void storeJsonObject(const JsonNode &node, const FindVariable &findVariable, UDataObject &object,
                      const SeeMember &seeMember = {});
 
-/// Rows that stand in a job: an object for a single row, or a list of objects. All of them are made at once.
+/// Rows that are in a job: an object for a single row, or a list of objects. All of them are made at once.
 class JsonObjectList : public RowList
 {
 public:
     /// @param path       leads to the values
     /// @param firstOnly  whether one row is enough, and those after it are not looked at
-    /// @param progress   is told now and then how many rows have been handed out. May be empty
+    /// @param progress   receives now and then the number of rows handed out. May be empty
     JsonObjectList(const JsonSource &source, const JsonPath &path, const FindVariable &findVariable, bool firstOnly,
                    ReadProgress progress);
 

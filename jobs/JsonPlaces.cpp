@@ -37,7 +37,7 @@ public:
         ++at_;
     }
 
-    /// The bytes of a string, as they stand between its quotes.
+    /// The bytes of a string, as they are between its quotes.
     QByteArrayView takeString()
     {
         peek();
@@ -166,7 +166,7 @@ std::optional<std::pair<Key, Key>> repeatedIn(std::vector<Key> &keys)
     return found;
 }
 
-/// The name of a key: the bytes as they stand, unless escapes hide what they say.
+/// The name of a key: the bytes as they are, unless escapes hide what they say.
 QByteArray nameOf(QByteArrayView bytes)
 {
     return bytes.contains('\\') ? textOf(bytes).toUtf8() : QByteArray::fromRawData(bytes.data(), bytes.size());

@@ -15,11 +15,11 @@ namespace kareport
 /// The way from a JSON document's root to a value: names of members and indices of elements.
 using JsonPath = std::vector<std::variant<QString, qsizetype>>;
 
-/// Where a value (or, with `ofKey`, the name of the member that holds it) stands in a JSON text that has been parsed
+/// Where a value (or, with `ofKey`, the name of the member that holds it) is in a JSON text that has been parsed
 /// already. Of members of one name the last counts. Nothing when the path does not exist.
 std::optional<TextPlace> placeInJson(const QByteArray &json, const JsonPath &path, bool ofKey = false);
 
-/// A key that stands twice in one object: parsers take the last one and say nothing.
+/// A key that occurs twice in one object: parsers take the last one and say nothing.
 struct RepeatedKey
 {
     QString key;

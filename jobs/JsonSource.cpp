@@ -17,7 +17,7 @@ namespace kareport
 namespace
 {
 
-/// A larger file is taken for something else.
+/// A larger file is not read as a job.
 constexpr qint64 largestJob = qint64(256) << 20;
 
 QString withDots(const JsonPath &path)
@@ -169,7 +169,7 @@ std::optional<QString> JsonSource::setText(const JsonPath &path) const
 
 InputError JsonSource::errorAt(const JsonPath &path, const QString &text, bool atKey) const
 {
-    // What was set on the command line is not the file's fault.
+    // An error in a value from the command line has no place in the file.
     for (JsonPath given = path; !given.empty(); given.pop_back()) {
         if (const auto option = options_.constFind(withDots(given)); option != options_.constEnd()) {
             return {*option, std::nullopt, text};
@@ -181,7 +181,7 @@ InputError JsonSource::errorAt(const JsonPath &path, const QString &text, bool a
     if (bytes_.isEmpty()) {
         return {path_, std::nullopt, text};
     }
-    // What is missing is missed where its parent stands.
+    // What is missing is reported at the place of its parent.
     JsonPath known = path;
     auto place = placeInJson(bytes_, known, atKey);
     while (!place && !known.empty()) {

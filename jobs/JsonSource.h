@@ -20,7 +20,7 @@ class JsonSource
 public:
     /// Reads a file; "-" is standard input, and its file names are relative to the current folder. A text that is no JSON, or whose root is no object, is an error.
     static Expected<JsonSource> read(const QString &path);
-    /// An object that stands in no file; its file names are relative to the current folder.
+    /// An object that is in no file; its file names are relative to the current folder.
     static JsonSource fromObject(const QJsonObject &object);
     static Expected<JsonSource> fromBytes(const QString &path, const QByteArray &bytes);
 
@@ -32,7 +32,7 @@ public:
     /// Says that the value at a key, with dots as for `set`, comes from an option, so that messages name that.
     void nameOption(const QString &key, const QString &option) { options_.insert(key, option); }
 
-    /// The file; empty for what stands in none.
+    /// The file; empty for what is in none.
     const QString &path() const { return path_; }
     const QJsonValue &root() const { return root_; }
 

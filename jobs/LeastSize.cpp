@@ -78,7 +78,7 @@ private:
         }
     }
 
-    /// A heading ends with the block or table that it stands over.
+    /// A heading ends with the block or table below it.
     void writeData()
     {
         heading_.text.clear();
@@ -86,7 +86,7 @@ private:
         line_.reset();
     }
 
-    /// Whether a new page is begun; nothing when that cannot be told.
+    /// Whether a new page is begun; nothing when that is not known.
     std::optional<bool> isNewPage(qint64 linesNeeded) const
     {
         if (isEmpty_ || linesNeeded < 0) {

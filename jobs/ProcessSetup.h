@@ -10,7 +10,7 @@ namespace kareport
 /// a failed write, as on a full disk, and not the end of the process.
 void prepareProcess();
 
-/// Whether standard output leads to a pipe that nobody reads any more.
+/// Whether standard output leads to a pipe without a reader.
 bool isOutputReaderGone();
 
 } // namespace kareport

@@ -8,7 +8,7 @@
 namespace kareport
 {
 
-/// Is told how far long work has come. How that is shown is a matter of whoever derives from it; as it is, nothing is.
+/// Is notified how far long work has come. A derived class decides how to show that; this one shows nothing.
 class Progress
 {
 public:
@@ -17,7 +17,7 @@ public:
     Progress(const Progress &) = delete;
     Progress &operator=(const Progress &) = delete;
 
-    /// What stands before all that is shown, for work that is one of many. Many short works do not flicker then: what each
+    /// A text before all that is shown, for work that is one of many. Many short works do not flicker then: what each
     /// begins with is shown a few times a second as well.
     void setPrefix(const QString &prefix) { prefix_ = prefix; }
     /// Begins a piece of work. @param total  what `advance` counts to; 0 when that is not known

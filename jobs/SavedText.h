@@ -16,10 +16,10 @@ namespace kareport
 
 /// Whether a name is that of a PDF.
 bool isPdfName(const QString &path);
-/// Whether a file is a PDF, by its name or by its first bytes. What is no file is not looked into.
+/// Whether a file is a PDF, by its name or by its first bytes. Anything but a file is not opened.
 bool isPdfFile(const QString &path);
 
-/// What stands in a saved report.
+/// The content of a saved report.
 struct SavedText
 {
     QString text;         ///< lines ended by CR LF

@@ -8,7 +8,7 @@
 namespace kareport
 {
 
-/// A template file larger than this is taken for something else.
+/// A larger file is not read as a template.
 inline constexpr qint64 largestTemplateFile = qint64(64) << 20;
 
 /// Whether a path can be a template file: what is wrong when it is none, or one that is far too large.

@@ -5,7 +5,7 @@
 namespace kareport
 {
 
-/// Data sets with the key "values": their rows stand in the job.
+/// Data sets with the key "values": their rows are in the job.
 DataKind valuesDataKind();
 
 } // namespace kareport

@@ -14,7 +14,7 @@ namespace kareport
 {
 
 /// A growing run of characters with a 0 after the last. Its capacity is counted in blocks and zeroed block by block;
-/// the memory behind it grows geometrically, so that a text of any length is copied a constant number of times.
+/// its memory grows geometrically, so that a text of any length is copied a constant number of times.
 ///
 /// What is free lies after the last character or, while pieces are replaced, as a gap where the last one was: pieces
 /// that are replaced from the front to the back move the text once. Reading the text in one piece closes the gap, and so
@@ -142,7 +142,7 @@ private:
             return false;
         }
         const qint64 counted = (characters + blockSize - 1) / blockSize * blockSize;
-        // With little memory left, what is asked for is enough.
+        // With little memory left, only what is asked for is allocated.
         if (counted > allocated_ && !allocate(std::max(counted, allocated_ * 2)) && !allocate(counted)) {
             return false;
         }

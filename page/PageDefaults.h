@@ -6,7 +6,7 @@
 namespace kareport
 {
 
-// What a report is laid out with for which nobody has chosen or measured anything else.
+// What a report is laid out with for which nothing else was chosen or measured.
 
 /// The margins of a page in hundredths of a millimetre.
 inline constexpr QMargins defaultMargins(1000, 1000, 1200, 2000);

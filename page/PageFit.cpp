@@ -30,7 +30,7 @@ PageFit fitPage(const PageText &text, const SheetRoom &room)
     const double scale = text.points > 0 ? fit.points / text.points : 1;
     fit.breaksRows = text.widestRow * scale > room.width * (1 + rounding);
     if (text.rows > 1 && text.rowHeight > 0) {
-        // A sheet takes one row at least, however low it is. More than all rows is as good as all.
+        // A sheet takes one row at least, however low it is. More than all rows is the same as all.
         const auto rows = static_cast<double>(text.rows);
         const double perSheet = std::clamp(std::floor(room.height / (text.rowHeight * scale) + rounding), 1.0, rows);
         fit.pieces = static_cast<qint64>(std::ceil(rows / perSheet));

@@ -24,7 +24,7 @@ struct SheetRoom
     double height = 0;
 };
 
-/// How a page of text goes on sheets.
+/// How a page of text is placed on sheets.
 struct PageFit
 {
     double points = 0;       ///< the type size
@@ -33,7 +33,7 @@ struct PageFit
 };
 
 /// Fits a page on a sheet: in its own type size, or in the smaller one that has room for all of its rows and for the widest
-/// of them, but not below `smallestType`. What has no room then goes on further sheets. Type that is smaller already stays
+/// of them, but not below `smallestType`. The rest continues on further sheets. Type that is smaller already stays
 /// as it is.
 PageFit fitPage(const PageText &text, const SheetRoom &room);
 

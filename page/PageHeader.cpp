@@ -16,7 +16,7 @@ namespace kareport
 namespace
 {
 
-/// What stands before the page number, without blanks, in every language and in the one of now.
+/// The text before the page number, without blanks, in every language and in the current one.
 QStringList pageLabels()
 {
     constexpr const char *label = "   Page:@@Report Header";

@@ -12,7 +12,7 @@ namespace kareport
 {
 
 /// The header line of every page, without the page number: application, title, and the date right-aligned so that the
-/// line with label and number ends a few characters before the row does. Where the row is too short for that, the date stands left and is filled on its
+/// line with label and number ends a few characters before the row does. Where the row is too short for that, the date is at the left and is padded on its
 /// right; this follows from the one width that the line is made with and is kept.
 QString pageHeaderLine(const QString &application, const QString &title, const QDateTime &time,
                        const QString &pageLabel, int charsPerRow);
@@ -28,7 +28,7 @@ bool isPageHeader(QStringView line);
 std::vector<qint64> pageHeadersIn(QStringView text);
 std::vector<qint64> pageHeadersIn(QLatin1StringView text);
 
-/// The lines of a page of a report, as its header lines tell: the number of lines that stands most often from one of them
+/// The lines of a page of a report, as its header lines tell: the number of lines that is most frequent from one of them
 /// to the next. Nothing for a text with fewer than two.
 std::optional<int> linesBetweenPageHeaders(QStringView text);
 /// The same where the header lines are known. @param headers  as `pageHeadersIn` gives them

@@ -27,7 +27,7 @@ public:
     /// without a printer
     bool measure(const std::optional<PageDevice> &device);
 
-    /// Gives the lines of a page or the characters of a row (1 or more) in the place of what is measured. With both, no font
+    /// Gives the lines of a page or the characters of a row (1 or more) instead of the measured ones. With both, no font
     /// is measured. What is not given is measured again by the next `measure`.
     void give(std::optional<int> linesPerPage, std::optional<int> charsPerRow);
     /// Whether the lines that were given count.
@@ -36,7 +36,7 @@ public:
     void useGiven(bool on);
     std::optional<int> givenLinesPerPage() const { return givenLinesPerPage_; }
 
-    /// Reads margins and font size from the user's preferences; where these have no margins, they get those of now.
+    /// Reads margins and font size from the user's preferences; where these have no margins, they get the current ones.
     void load();
     /// Writes the margins to the user's preferences.
     void save() const;

@@ -16,7 +16,7 @@ public:
 
     /// Takes up a text. @param starts  the lines that pages were begun with, in ascending order
     void load(std::vector<int> starts, int lineCount, const IsBlank &isBlank);
-    /// An edit that has put `added` line ends in the place of `removed` ones, from a line on.
+    /// An edit that has replaced `removed` line ends by `added` ones, from a line on.
     /// @param starts  the lines that pages begin with now, from that line to the last one that the edit has left
     void replace(int line, int removed, int added, const std::vector<int> &starts, const IsBlank &isBlank);
 

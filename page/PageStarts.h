@@ -11,7 +11,7 @@ namespace kareport
 
 /// Where the pages of a report begin, as its writer recorded them: places in its text, counted in characters from 0.
 ///
-/// Edits of the text carry them along. A place that no longer stands at the beginning of a line stays, so that it counts
+/// Edits of the text carry them along. A place that is no longer at the beginning of a line stays, so that it counts
 /// again when the line end comes back; `reportPages` passes it over.
 class PageStarts
 {
@@ -31,14 +31,14 @@ public:
     ///
     /// A start whose text before it is removed stays with its page. Text put in at a page's start belongs to the page
     /// before when it ends with a line end, else to the page. An inserted piece brings pages along where page headers
-    /// stand in it, or where it was removed together with them. The exact inverse of an edit, which is what an undo is,
-    /// gives the starts back that there were.
+    /// are in it, or where it was removed together with them. The exact inverse of an edit, which is what an undo is,
+    /// restores the earlier starts.
     /// @param removedText  what is removed; empty where `wantsRemoved` says no
     /// @param beginsLine   whether the place is the beginning of a line. Looked at only where the first line that is
     ///                     inserted is a page header, which is longer than `shortestHeader`
     Edit prepare(qint64 at, qint64 removed, QStringView removedText, QStringView inserted, bool beginsLine);
     static constexpr qint64 shortestHeader = 20;
-    /// Whether `prepare` wants to see what is removed.
+    /// Whether `prepare` needs the text that is removed.
     bool wantsRemoved(qint64 at, qint64 removed, qint64 inserted) const;
     void carryOut(Edit &&edit) noexcept;
 

@@ -262,7 +262,7 @@ void PageWriter::writeHeading()
 
 void PageWriter::writeHeader()
 {
-    // Counted here and once more when the heading is written: a heading of several lines reserves a spare line for each
+    // Counted here and again when the heading is written: a heading of several lines reserves a spare line for each
     // of its line breaks. Page layouts in use are tuned to it.
     const int lineFeeds = countLineFeeds(heading_.text);
     lineNumber_ += lineFeeds;

@@ -15,12 +15,12 @@
 namespace kareport
 {
 
-/// Is told what is written, piece by piece.
+/// Is notified of what is written, piece by piece.
 class PageWriterObserver
 {
 public:
     virtual ~PageWriterObserver();
-    /// Whether it wants the text of what is written. Otherwise it need only be told that something was.
+    /// Whether it needs the text that is written. Otherwise it is only notified that something was.
     virtual bool takesText() const { return true; }
     /// A piece of text, never empty, with the style it was written in. @return false when there is no memory for it: it is
     /// then not written at all
@@ -58,21 +58,21 @@ public:
     /// Hands on what is left. @return whether all of the text was taken
     bool emptyIntoOutlet();
 
-    /// Where each page begins. A text that is handed on has no record: nobody can look at its pages.
+    /// Where each page begins. A text that is handed on has no record: its pages cannot be looked at.
     const PageStarts &pageStarts() const { return starts_; }
     void setPageStarts(std::vector<qint64> starts) { starts_.assign(std::move(starts)); }
-    /// Takes a text in the place of this one, which is handed back. @param lineEnds  counted as if they had been written
+    /// Exchanges the text for another one. @param lineEnds  counted as if they had been written
     void exchangeText(ReportText &text, std::vector<qint64> pageStarts, qint64 lineEnds);
     /// Replaces a piece of the text and carries the page starts along.
     /// @return false, changing nothing, for a piece that is not in the text or when there is no memory
     bool replace(qint64 at, qint64 removed, QStringView inserted);
 
-    /// Whether a part of what was to be written since the last `clear` is missing, because memory has ended.
+    /// Whether a part of what was to be written since the last `clear` is missing, because memory ran out.
     bool hasLostText() const { return losses_ != 0; }
     void noteLostText() { ++losses_; }
     /// How often something was lost.
     quint64 losses() const { return losses_; }
-    /// Does something that writes; where memory ends in the middle, what comes then is lost. @return whether nothing was
+    /// Does something that writes; where memory runs out in the middle, what comes then is lost. @return whether nothing was
     template <typename Write>
     bool losesNothing(Write write)
     {

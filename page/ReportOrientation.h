@@ -7,7 +7,7 @@
 namespace kareport
 {
 
-/// Lets the module's printer stand as the user has reports printed, upright or not, for as long as the guard lives.
+/// Sets the module's printer upright or not, as the user prints reports, for as long as the guard lives.
 inline auto reportOrientation()
 {
     return ValueGuard(UPreviewDlg::IsModulePrinterOrientationPortrait(), IsReportPrinterSetToPortrait(),

@@ -62,7 +62,7 @@ template <typename View>
 std::vector<ReportPage> cut(View text, const std::vector<qint64> &starts, int linesPerPage)
 {
     std::vector<ReportPage> pages;
-    qint64 begin = -1; // of the page at hand, once the first start was found
+    qint64 begin = -1; // of the current page, once the first start was found
     const auto cutByLines = [&](qint64 stop) {
         for (qint64 at = 0; at < stop;) {
             const qint64 next = std::min(stop, afterLines(text, at, std::max(1, linesPerPage)));

@@ -248,7 +248,7 @@ void ReportText::drain()
 void ReportText::clear()
 {
     pending_.clear();
-    // The narrow block comes first, so that there is a block also when no other can be had.
+    // The narrow block comes first, so that there is a block even if no other can be allocated.
     if (!isNarrow_ && narrow_.reserve(1)) {
         wide_.clear(false);
         isNarrow_ = true;

@@ -14,7 +14,7 @@ namespace kareport
 /// The text of a report: one growing run of characters, ended by a 0.
 ///
 /// Most reports hold no character above U+00FF. Such a text is kept with one byte a character, which halves the memory of
-/// long reports, until somebody asks for it in UTF-16 or writes another character.
+/// long reports, until it is asked for in UTF-16 or another character is written.
 class ReportText
 {
 public:
@@ -27,8 +27,8 @@ public:
     /// One block, empty. @throws std::bad_alloc when there is no memory for it
     explicit ReportText(Reallocate reallocate = nullptr);
 
-    /// The characters in UTF-16, with a 0 after the last; valid until the next change. A text that cannot be had in
-    /// UTF-16 because memory has ended shows as an empty one; `size` still says its length.
+    /// The characters in UTF-16, with a 0 after the last; valid until the next change. A text that cannot be converted to
+    /// UTF-16 because memory ran out shows as an empty one; `size` still says its length.
     const char16_t *data() const;
     qint64 size() const { return (isNarrow_ ? narrow_.size() : wide_.size()) + pending_.growth(); }
     bool isEmpty() const { return size() == 0; }

@@ -82,7 +82,7 @@ qint64 LinePager::layOutScaled(const QRect &twips, qint64 start, qint64 stop, qr
     if (start < 0 || start >= end || twips.isEmpty() || scale <= 0) {
         return start;
     }
-    // In dots of the type's own size, so that rows break and stand at every size as they do at this one.
+    // In dots of the type's own size, so that rows break in the same places at every size.
     const SheetRoom sheet = room(twips);
     PageArea area;
     area.width = sheet.width / scale + lostDots;

@@ -18,7 +18,7 @@ struct PageArea;
 /// Lays the lines of a text out in pages and draws them: the one rule for where a page ends, whether pages are counted,
 /// shown or printed.
 ///
-/// A line that is wider than the page goes on in the next row. A page takes one row at least, however high it is.
+/// A line that is wider than the page continues in the next row. A page takes one row at least, however high it is.
 ///
 /// Faces are made once: a pager serves one job, in which the text stays as it is.
 class LinePager

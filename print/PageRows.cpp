@@ -208,7 +208,7 @@ int PageRows::endOfPiece(int from, int stop) const
 qreal PageRows::wholeWidth() const
 {
     qreal widest = 0;
-    qreal width = 0; // of the row at hand, which may take several pieces
+    qreal width = 0; // of the current row, which may take several pieces
     const auto stop = static_cast<int>(line_.size());
     for (int from = 0, end = 0; from < stop; from = end) {
         end = endOfPiece(from, stop);
@@ -233,7 +233,7 @@ PageRows::LineSize PageRows::measureLine(const QTextBlock &block)
     readRuns(block, 0, stop);
     const auto rows = static_cast<int>(line_.count(QChar::LineSeparator)) + 1;
     const int height = extents(0, stop).height * rows;
-    // Blanks at a line's end may stand in the margin.
+    // Blanks at a line's end may extend into the margin.
     while (stop > 0 && line_[stop - 1] == u' ') {
         --stop;
     }
@@ -257,7 +257,7 @@ int PageRows::addWrapped(int from, int stop)
             row.setLineWidth(area_.width);
             const int rowEnd = pieceStart + row.textStart() + row.textLength();
             if (rowEnd == pieceEnd && pieceEnd < stop && row.textStart() > 0) {
-                break; // the row goes on in the next piece
+                break; // the row continues in the next piece
             }
             const Extents taken = extents(from, rowEnd);
             if (!reserve(taken.height)) {

@@ -25,7 +25,7 @@ struct PageSheet
 struct PageSetup
 {
     QMargins margins;     ///< hundredths of a millimetre
-    bool portrait = true; ///< whether paper stands upright
+    bool portrait = true; ///< whether paper is upright
     QString printer;      ///< empty for the built-in page device
     QStringList printers; ///< to choose from
     QSize sheet;          ///< upright, in points; empty for the printer's own

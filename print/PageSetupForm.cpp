@@ -127,7 +127,7 @@ void PageSetupForm::addMargins(QVBoxLayout &layout)
     const std::array<QString, 4> labels = {Xlate("&Left:"), Xlate("&Top:"), Xlate("&Right:"), Xlate("&Bottom:")};
     const std::array<QString, 4> names = {Xlate("Left margin"), Xlate("Top margin"), Xlate("Right margin"),
                                           Xlate("Bottom margin")};
-    // Left and right stand side by side, top and bottom below them.
+    // Left and right are side by side, top and bottom below them.
     constexpr std::array<std::pair<int, int>, 4> places = {{{0, 0}, {1, 0}, {0, 1}, {1, 1}}};
     for (std::size_t i = 0; i < margins_.size(); ++i) {
         auto *field = new QDoubleSpinBox;
@@ -159,7 +159,7 @@ void PageSetupForm::addPages(QVBoxLayout &layout)
     pagesLayout->addWidget(measuredPages_);
     givenPages_->setEnabled(setup_.givenLines.has_value());
     (setup_.givenLines && setup_.keepsGivenPages ? givenPages_ : measuredPages_)->setChecked(true);
-    // A screen reader says no box around a button.
+    // A screen reader does not read a box around a button.
     for (QRadioButton *button : {givenPages_, measuredPages_}) {
         button->setAccessibleName(Xlate("Pages: %1").arg(button->text().remove(u'&')));
     }
@@ -244,7 +244,7 @@ void PageSetupForm::showSheet()
 
 void PageSetupForm::checkMargins()
 {
-    // Said when the user wants to leave, not while he is still typing; taken back as soon as it is no longer true.
+    // Shown when the user wants to leave, not while typing; removed as soon as it is no longer true.
     if (!warning_->isHidden() && leavesRoom()) {
         warning_->hide();
     }

@@ -34,7 +34,7 @@ bool askPrint(QPrinter &printer, int maxPage, QWidget *parent)
     if (installed().print) {
         return installed().print(printer, maxPage, parent);
     }
-    // The parent may go, and the dialog with it, while it is open.
+    // The parent may be destroyed, and the dialog with it, while it is open.
     const QPointer<QPrintDialog> dialog = new QPrintDialog(&printer, parent);
     dialog->setWindowTitle(Xlate("Print"));
     keepLabelsPlain(*dialog); // they show what printers say of themselves

@@ -11,7 +11,7 @@ class QWidget;
 namespace kareport
 {
 
-/// The windows in which a user answers for a print command. A member that is empty stands for Qt's own window, or ours.
+/// The windows in which the user answers a print command. An empty member means Qt's own window, or ours.
 struct PrintDialogs
 {
     /// Asks for printer, pages and copies and sets the printer up with them. @param maxPage  the last page that can be

@@ -18,7 +18,7 @@ QSize twipsOfDots(const QSize &sheet, unsigned resolution);
 int twipsOfMillimetres(qreal millimetres);
 
 /// How many pages a print job is expected to have before it is laid out, by the lines that were written: what the print
-/// dialog begins with. How many there are is told by `reportPages`, and by the sheets of the job.
+/// dialog begins with. `reportPages`, and the sheets of the job, give the real number.
 /// @return 0 for a page without lines, and a number below 0 where the page has fewer than none: there is then no page either
 int expectedPages(int lines, int linesPerPage);
 

@@ -89,7 +89,7 @@ private:
         }
     }
 
-    /// Lets other events happen. @return whether the job goes on after them
+    /// Lets other events happen. @return whether the job continues after them
     bool goesOn(int page)
     {
         if (progress_.step(page) && !source_.isUnchanged()) {

@@ -14,7 +14,7 @@ namespace kareport
 /// What a print job prints, page by page.
 struct PrintSource
 {
-    int expectedPages = 0; ///< for the progress; the job goes on while there is text
+    int expectedPages = 0; ///< for the progress; the job continues while there is text
     std::function<void(QPainter &painter)> begin;
     std::function<void(QPainter &painter)> end;
     /// Finds where a page begins; pages are asked for one after the other at first. @return false when there is no such page
@@ -30,7 +30,7 @@ enum class PrintResult
     Done,
     Empty,     ///< there is no page
     Cancelled, ///< by the user
-    Changed,   ///< the text has changed or gone meanwhile
+    Changed,   ///< the text has changed or was closed meanwhile
     Failed     ///< the printer does not print
 };
 
@@ -43,9 +43,9 @@ struct PrintOutcome
     bool isCut = false; ///< whether more pages were left out for the limit
 };
 
-/// Prints the pages that the printer is set to, in its order. The windows of the program go on answering; after a moment one
-/// of them shows how far the job is and lets the user cancel it. A job that does not come to its end leaves nothing in a
-/// print queue, and an earlier file as it was.
+/// Prints the pages that the printer is set to, in its order. The windows of the program stay responsive; after a
+/// moment one of them shows how far the job is and lets the user cancel it. A job that does not come to its end leaves
+/// nothing in a print queue, and an earlier file as it was.
 /// @param lastPage  stops there, for a preview that cannot hold more, and says in the outcome whether there is a page
 ///                  after it; 0 for no limit
 PrintOutcome printPages(QPrinter &printer, const PrintSource &source, QWidget *parent, int lastPage = 0);

@@ -29,7 +29,7 @@ private:
     void show();
 
     QPointer<QWidget> parent_;
-    QPointer<QProgressDialog> dialog_; ///< may go with its parent
+    QPointer<QProgressDialog> dialog_; ///< may be destroyed with its parent
     int expected_;
     bool shown_ = false;
     bool cancelled_ = false;

@@ -14,7 +14,7 @@
 namespace kareport
 {
 
-/// What is found out once for all sheets of a job.
+/// What is computed once for all sheets of a job.
 struct PrintRun
 {
     PrintRun(QTextDocument &text, QPaintDevice &device)

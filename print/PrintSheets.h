@@ -22,7 +22,7 @@ struct PrintSheet
 
 /// The sheets that pages take, each of which begins on one of its own. All pages have type of one size: the largest that
 /// has room for the widest row of the text and for every page of `usualLines` lines at most. A page of more lines has its own,
-/// and one that has no room in the smallest type goes on on further sheets.
+/// and one that has no room in the smallest type continues on further sheets.
 /// @param twips  the part of a sheet that takes text
 std::vector<PrintSheet> printSheets(LinePager &pager, const QRect &twips, const std::vector<ReportPage> &pages,
                                     qint64 usualLines);

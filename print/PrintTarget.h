@@ -23,7 +23,7 @@ public:
 
     /// After the painter has ended. @return whether the pages are where they belong
     bool commit();
-    /// Gives the pages up.
+    /// Discards the pages.
     void discard();
     /// Whether the pages go to a printer's queue: not into a file, nor to a preview.
     bool isQueue() const { return isQueue_; }

@@ -38,7 +38,7 @@ struct DataRemarks
             hasNew_ = true;
         }
     }
-    /// Says which line of the report the row stands in that was added last.
+    /// Says which line of the report the row is in that was added last.
     void setLine(qint64 line)
     {
         if (hasNew_) {

@@ -33,18 +33,18 @@ QString saveForEditor(UReportDoc &report, QString name)
     // An empty report makes no file, so it needs no place for one.
     while (!report.IsEmpty() && !makePrivateFile(name)) {
         if (!isNameTaken(name)) {
-            return name; // as good as any other: there is no folder to write to
+            return name; // any name will do: there is no folder to write to
         }
         const QString taken = std::exchange(name, report.GetCurrentReportFileName());
         if (name == taken) {
-            return QString(); // all names are, and what stands there is not the report
+            return QString(); // all names are, and the file there is not the report
         }
     }
     report.OnSaveDocument(name);
     return name;
 }
 
-/// Writes the rich-text image beside a temporary name. @return the file; empty when it cannot be written
+/// Writes the rich-text image next to a temporary name. @return the file; empty when it cannot be written
 QString writeRichTextForEditor(const UReportDoc &report, const QString &name)
 {
     QFile file(QString(name).replace(QStringLiteral(".rep"), QStringLiteral(".rtf")));
@@ -92,7 +92,7 @@ void openWrittenInEditor(UReportDoc &report, const QString &editor)
 {
     const QString name = report.GetCurrentReportFileName();
     if (name.isEmpty()) {
-        return; // memory has ended
+        return; // memory ran out
     }
     const bool takesRichText = editorKind(editor, report.IsOptionExcel()) == EditorKind::WordProcessor;
     const QString richText = takesRichText ? writeRichTextForEditor(report, name) : QString();

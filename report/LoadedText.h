@@ -34,7 +34,7 @@ enum class TextLoading
 
 /// Reads the bytes of a report file, as `decodeReportText` does.
 /// @param loaded   as it was made: empty
-/// @param proceed  is told the bytes done; its false stops the work. May be empty
+/// @param proceed  receives the bytes done; its false stops the work. May be empty
 TextLoading loadReportText(QByteArrayView bytes, LoadedText &loaded,
                            const std::function<bool(qint64 done)> &proceed = {});
 /// Reads bytes that are the text in UTF-8, with its own line ends. What is no UTF-8 reads as a sign for that.

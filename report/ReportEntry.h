@@ -17,10 +17,10 @@ KAREPORT_EXPORT void LoadKaReport();
 namespace kareport
 {
 
-/// Tells that the application goes on, because the user has cancelled its exit or it was refused: a report whose closing
-/// the exit has deferred closes normally again (`UReportDoc::SetCloseDocument`), and is closed now when that was asked for
-/// meanwhile (`UReportDoc::CloseReportDocument`). What the host itself has deferred stays so. A main frame whose
-/// `closeEvent` refuses calls it.
+/// Reports that the application continues, because the user has cancelled its exit or it was refused: a report whose
+/// closing the exit has deferred closes normally again (`UReportDoc::SetCloseDocument`), and is closed now when that
+/// was asked for meanwhile (`UReportDoc::CloseReportDocument`). What the host itself has deferred stays so. A main
+/// frame whose `closeEvent` refuses calls it.
 KAREPORT_EXPORT void noteExitCancelled();
 
 /// A new document template for reports with panes and views of the host's own; with none given, reports are made without

@@ -6,7 +6,7 @@
 namespace kareport
 {
 
-// Settings of a report that stand otherwise for a moment. What is done meanwhile may close the report.
+// Settings of a report that are changed for a moment. What is done meanwhile may close the report.
 
 /// Keeps a report from the user's editor: updates reach its views alone.
 inline auto withoutEditor(UReportDoc &report)

@@ -15,7 +15,7 @@ class UDocument;
 namespace kareport
 {
 
-/// What a report document is made of. The parts do the work and know nothing of `UReportDoc`, which joins them; what stands
+/// What a report document is made of. The parts do the work and know nothing of `UReportDoc`, which joins them; what is
 /// here by itself are the settings that its own functions read and write.
 struct ReportParts
 {

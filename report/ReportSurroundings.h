@@ -13,7 +13,7 @@ namespace kareport
 struct DataRemarks;
 
 /// What a report takes from around it: from the application, the printer, the user's preferences and the clock, unless
-/// whoever makes the report says otherwise (`UReportDoc::SetSurroundings`).
+/// the code that makes the report says otherwise (`UReportDoc::SetSurroundings`).
 struct ReportSurroundings
 {
     QString application;                 ///< the name that page headers begin with

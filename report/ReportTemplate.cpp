@@ -24,7 +24,7 @@ QString fileIn(QString folder, const QString &fileName)
 
 QStringList templatePaths(const QString &fileName)
 {
-    QStringList paths; // one after the other: a list of its members in braces does not survive when memory ends
+    QStringList paths; // one after the other: a list of its members in braces does not survive when memory runs out
     paths.append(fileIn(GetLibraryDir(false), fileName));
     paths.append(fileIn(GetStartPathName(), fileName));
     return paths;
@@ -33,7 +33,7 @@ QStringList templatePaths(const QString &fileName)
 bool ReportTemplate::load(const QStringList &paths, const QString &templateName, const QString &tableName,
                           const QString &blockName)
 {
-    // The handles point into the template that goes: they go with it.
+    // The handles point into the template that is replaced: they are reset with it.
     table_.reset();
     block_.reset();
     template_ = std::make_unique<UXmlReportTpl>();

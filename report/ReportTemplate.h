@@ -19,7 +19,7 @@ namespace kareport
 /// The template that a report's data is written through, with one table and one block of it, and what the texts of the
 /// values depend on besides their fields.
 ///
-/// The functions throw `std::bad_alloc` when memory ends. What a failed load was to replace is gone.
+/// The functions throw `std::bad_alloc` when memory runs out. What a failed load was to replace is lost.
 class ReportTemplate
 {
 public:
@@ -28,7 +28,7 @@ public:
     bool pageBreaks = true;               ///< the option of the template that was loaded last
     bool zeroBlank = false;               ///< values of zero show as blanks
     static inline bool printHash = false; ///< values wider than their column show as "#": one setting for all reports
-    std::optional<bool> ownPrintHash;     ///< in the place of that; nothing for none
+    std::optional<bool> ownPrintHash;     ///< instead of that; nothing for none
     DataRemarks *remarks = nullptr;       ///< receives what a table does not show as it is; null for nobody
 
     /// Loads a template from the first of the files that has it, and then the table and the block unless their names are

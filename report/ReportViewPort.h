@@ -12,7 +12,7 @@ namespace kareport
 class KAREPORT_EXPORT ReportViewPort
 {
 public:
-    /// Whose pane a view stands in.
+    /// Whose pane a view is in.
     enum class Pane
     {
         OfHost,
@@ -21,7 +21,7 @@ public:
     };
 
     virtual ~ReportViewPort();
-    /// Loads the report's text where it was changed since and the view was not told, as a view that nobody sees is not.
+    /// Loads the report's text where it was changed since and the view was not notified, as a hidden view is not.
     /// Nothing in a view that always shows what the report holds.
     virtual void loadIfStale() {}
     /// Loads at once what a view that loads a long text in pieces does not show yet.
@@ -31,7 +31,7 @@ public:
     /// The same as plain text of one byte a character. @return false as soon as a write fails
     virtual bool streamPlainText(QIODevice &device) const = 0;
 
-    /// Whose pane the view stands in; the host's until the report says otherwise.
+    /// Whose pane the view is in; the host's until the report says otherwise.
     Pane pane() const { return pane_; }
     /// Notes whose pane the view stands in, which the report does that has opened it.
     void setPane(Pane pane) { pane_ = pane; }

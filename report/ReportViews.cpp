@@ -53,7 +53,7 @@ void noteOwnPane(const CViewPane &pane, bool shown)
 
 void showReportPane(CViewPane &pane, bool show)
 {
-    // A pane that is hidden already was hidden by whoever did it.
+    // A pane that is hidden already was hidden by other code.
     const bool isChanged = pane.IsVisible() != show;
     for (const auto &view : pane.GetViews()) {
         auto *port = dynamic_cast<ReportViewPort *>(view.get());
@@ -68,7 +68,7 @@ void closeOwnHiddenPanes(const UReportDoc &report)
 {
     for (const UView *view : reportViews(report)) {
         if (std::find(report.GetViews().begin(), report.GetViews().end(), view) == report.GetViews().end()) {
-            continue; // it has gone with a pane that was closed before
+            continue; // it was closed with an earlier pane
         }
         const auto *port = dynamic_cast<const ReportViewPort *>(view);
         CViewPane *pane = view->GetParentPane();

@@ -24,7 +24,7 @@ KAREPORT_EXPORT void finishLoading(const UReportDoc &report);
 void openOwnPane(UReportDoc &report);
 /// Notes that the report has made a pane for itself. @param shown  whether it is shown as well
 void noteOwnPane(const CViewPane &pane, bool shown);
-/// Shows or hides a pane in which the report stands, and notes of one of its own that it did.
+/// Shows or hides a pane in which the report is, and notes of one of its own that it did.
 void showReportPane(CViewPane &pane, bool show);
 /// Closes those of a report's own panes that it keeps hidden. What a host hides is the host's to close.
 void closeOwnHiddenPanes(const UReportDoc &report);

@@ -9,8 +9,8 @@ namespace kareport
 bool TextMirrors::textWritten(QStringView text, int style)
 {
     const bool isTaken = whileMemoryLasts(false, [&] {
-        // The window is told first: a host's window may look at the rich text, which then ends before the piece. It takes
-        // nothing back, so a piece that the rich text has no memory for stays in the window alone.
+        // The window is notified first: a host's window may look at the rich text, which then ends before the piece.
+        // It takes nothing back, so a piece that the rich text has no memory for stays in the window alone.
         if (window != nullptr) {
             window->WriteLine(text.toString());
         }

@@ -39,7 +39,7 @@ struct ReportSurroundings;
 /// Reports are made through their document template (`CreateReport`), which owns them. Functions answer false or 0 when
 /// they cannot do what they are asked, and never throw. What writes text, line ends or a page header sets the modified flag.
 ///
-/// Three things surprise a newcomer and are meant. An update of the views (`UpdateAllViews`) starts the user's editor when
+/// Three things may surprise a newcomer and are intended. An update of the views (`UpdateAllViews`) starts the user's editor when
 /// the report is marked for it, and may close the report. `SaveFile` answers 1 also when the save failed. A report that has
 /// lost text because memory ran out (`HasLostText`) is never saved.
 class KAREPORT_EXPORT UReportDoc : public UDocument
@@ -48,11 +48,11 @@ public:
     /// @param name            title and report file name; a null text for none
     /// @param externalEditor  meant for the user's preferred editor
     /// @param closeDocument   closes as soon as its content has been handed to an editor
-    /// @param owner           the host document that asked for the report, told when it goes; null for none. It is not
+    /// @param owner           the host document that asked for the report, notified when it is deleted; null for none. It is not
     ///                        owned and must outlive the report
     UReportDoc(const QString &name, bool externalEditor, bool closeDocument, UDocument *owner);
     UReportDoc();
-    /// A report that asks nobody: its surroundings are given, and hold until others are.
+    /// A report with given surroundings, which hold until others are given.
     explicit UReportDoc(const kareport::ReportSurroundings &surroundings);
     ~UReportDoc() override;
 
@@ -72,7 +72,7 @@ public:
     QStringView GetText() const;
     /// Whether the report has no text.
     bool IsEmpty() const;
-    /// Whether a part of what was to be written, or set, since the last `Clear` is missing because memory has ended. Such a
+    /// Whether a part of what was to be written, or set, since the last `Clear` is missing because memory ran out. Such a
     /// report is not saved, also when nothing is left of it.
     bool HasLostText() const;
     /// Hands the text on to a writer while it is written, so that a report that only becomes a file may be longer than there
@@ -85,7 +85,7 @@ public:
     /// found by its page headers. Without memory for it the text is empty, and lost.
     void SetData(const QString &text);
     /// Takes over a text that was made elsewhere, as on another thread, in a time that does not grow with it. Its lines are
-    /// counted as if they had been written, and its pages begin where it says. Neither rich text nor a report window is told
+    /// counted as if they had been written, and its pages begin where it says. Neither rich text nor a report window is notified
     /// of it. Its type is not among the installed headers: it serves the programs of this project.
     /// @param text  is handed the text before it
     void TakeText(kareport::LoadedText &text);
@@ -125,7 +125,7 @@ public:
     void SetHeading(const QString &heading, int linesBefore, int linesAfter);
     /// Writes the heading where the report is; does not look for a page's end.
     void WriteHeading();
-    /// Builds the header line anew from application, title and the time of now.
+    /// Builds the header line again from application, title and the current time.
     void SetHeader();
     /// Writes the header line with the page's number where the report is, and the line ends after it.
     void WriteHeader();
@@ -158,7 +158,7 @@ public:
     /// Writes the font table to an open device. @return false when the write fails or memory ends
     bool WriteFontTable(QIODevice &device) const;
     /// Writes the rich-text document for a word processor to an open device, one byte a character.
-    /// @return false as soon as a write fails, when memory ends or when the report has lost text
+    /// @return false as soon as a write fails, when memory runs out or when the report has lost text
     bool WriteRichTextFile(QIODevice &device) const;
 
     // --- Pages: UReportDocPages.cpp ---------------------------------------------------------------------------------
@@ -182,7 +182,7 @@ public:
     /// document they are those of the text that is shown, as `kareport::shownPlainText` gives it.
     std::vector<kareport::ReportPage> GetPages() const;
     /// Where pages begin, as the writer recorded it: the places of characters in the text, from 0, in ascending order. A
-    /// place that does not stand at the beginning of a line counts for nothing.
+    /// place that is not at the beginning of a line counts for nothing.
     const std::vector<qint64> &GetPageStarts() const;
     /// Replaces the record of where pages begin. @param starts  in ascending order
     void SetPageStarts(std::vector<qint64> starts);
@@ -211,7 +211,7 @@ public:
     void LoadSettings();
     /// Writes the margins to the user's preferences.
     void SaveSettings();
-    /// Lets what is given hold for the report in the place of the application's name, its clock, the default printer, the
+    /// Lets what is given hold for the report instead of the application's name, its clock, the default printer, the
     /// user's preferences and the setting for wide values; margins and font size are taken over. Nothing lets the program's
     /// own hold again: margins and font size then stay. Neither measures the page.
     void SetSurroundings(const std::optional<kareport::ReportSurroundings> &surroundings);
@@ -220,7 +220,7 @@ public:
 
     /// Loads a template from a file of the library folder or, failing that, of the start folder, and with it a table
     /// and a block unless their names are empty. Takes over the template's separator and page breaks, and its title once
-    /// table and block are loaded. Whatever table and block were loaded before go with the template before.
+    /// table and block are loaded. Table and block that were loaded before are dropped with the template before.
     /// @return false when neither file has the template (separator, page breaks and title then stay), or when table or
     ///         block cannot be loaded
     bool LoadTemplateXml(const QString &fileName, const QString &templateName, const QString &tableName,
@@ -228,13 +228,13 @@ public:
     /// The same from the file at a path.
     bool LoadTemplateFile(const QString &path, const QString &templateName, const QString &tableName,
                           const QString &blockName);
-    /// Loads a table of the loaded template in the place of the one before, which is gone also when this fails.
+    /// Loads a table of the loaded template instead of the one before, which is dropped even if this fails.
     /// @return false without a template, when it has no such table or not its dictionary, or without memory
     bool LoadTemplateTable(const QString &tableName);
-    /// Loads a block of the loaded template in the place of the one before, which is gone also when this fails.
+    /// Loads a block of the loaded template instead of the one before, which is dropped even if this fails.
     /// @return false without a template, when it has no such block or not its dictionary, or without memory
     bool LoadTemplateBlock(const QString &blockName);
-    /// The loaded template, or null. It is the report's, and goes when another one is loaded.
+    /// The loaded template, or null. It is the report's, and is deleted when another one is loaded.
     const UXmlReportTpl *GetTemplate() const;
 
     /// The text of a value, fitted to its field. @param kind  what `value` points to: 1 a bool, 2 a qint16, 4 a qint32,
@@ -244,14 +244,14 @@ public:
                                      const QString &offsetStyle) const;
 
     /// Writes an object through the loaded block: a line for each field that the object has a value for.
-    /// @return false, with nothing written, when no block is loaded or the object is null; false as well when memory ends in
+    /// @return false, with nothing written, when no block is loaded or the object is null; false as well when memory runs out in
     ///         the middle: what comes then is not written
     bool WriteDataBlock(const UDataObject *object, int linesBefore, int linesAfter);
     /// Loads a block and writes through it, as the two functions do.
     bool WriteDataBlock(const QString &blockName, const UDataObject *object, int linesBefore, int linesAfter);
     /// Writes a list through the loaded table: heading, then a line for each object, sorted if the table says so.
     /// @param headingLinesAfter  line ends after the heading; -1 for 2
-    /// @return false, with nothing written, when no table is loaded or the list is null; false as well when memory ends in
+    /// @return false, with nothing written, when no table is loaded or the list is null; false as well when memory runs out in
     ///         the middle: what comes then is not written
     bool WriteDataTable(UDataObjectList *list, int linesBefore, int linesAfter, int headingLinesAfter);
     /// Loads a table and writes through it, as the two functions do.
@@ -306,7 +306,7 @@ public:
     void SetReportWindowActive();
     /// Shows a report window or hides it; nothing for null.
     static void ShowReportBar(kareport::ReportWindow *window, bool show);
-    /// Takes the report up for another run: hides its pane, brings its window back when it was closed, and gives it a name
+    /// Prepares the report for another run: hides its pane, brings its window back when it was closed, and gives it a name
     /// and flags as `CreateReport` does. What the report holds stays; a name that its title does not begin with is written
     /// under it, between blank lines.
     /// @param name  a null text leaves title and file name as they are
@@ -323,7 +323,7 @@ public:
     /// Whether the report goes to the user's preferred editor: it is marked for it, and an editor is preferred and
     /// installed. The preferences are looked up each time.
     bool UsePreferredReportEditor() const;
-    /// Lets the report go to the spreadsheet as to a word processor.
+    /// Lets the report be opened in the spreadsheet as in a word processor.
     void SetOptionExcel();
     /// Whether `SetOptionExcel` was called.
     bool IsOptionExcel() const;
@@ -336,23 +336,23 @@ public:
     bool IsConvertToOpenInWord(const QString &file, const QString &editor);
     /// Shows the report as it is now. A report that goes to the user's preferred editor is written into a new temporary
     /// file and opened there, each time; its pane is hidden. Any other updates its views and shows its pane. Property panes
-    /// are told in either case. With the close-document flag the pane stays as it is, and a report that went to the editor
+    /// are notified in either case. With the close-document flag the pane stays as it is, and a report that went to the editor
     /// closes.
     ///
     /// So whatever updates the views starts the editor and may close the report, an edit in the view included: callers look
-    /// at `IsReportAvailable` before they go on. The flag is cleared for a moment where only views are to be updated.
+    /// at `IsReportAvailable` before they continue. The flag is cleared for a moment where only views are to be updated.
     void UpdateAllViews(UView *sender, long hint = 0, void *hintObject = nullptr) override;
     /// Makes a second, hidden report in rich-text mode of the lines of this one, without blank lines, and opens it in the
     /// user's preferred editor. It stays open. Nothing happens without the application's template for reports.
     void ConvertAndOpenInWord();
     /// Opens the report in the user's preferred editor: what was written in rich-text mode for a word processor, the text
-    /// for any other. A report that does not go there is shown in its view, in a new pane where it has none.
+    /// for any other. A report that is not opened there is shown in its view, in a new pane where it has none.
     void ReportRTfData();
     /// The name that temporary files are named after.
     void SetReportFileName(const QString &name);
     /// The name that temporary files are named after; empty until it is set.
     const QString &GetReportFileName() const;
-    /// A temporary name for the report that no report has had; empty when memory ends.
+    /// A temporary name for the report that no report has had; empty when memory runs out.
     QString GetCurrentReportFileName() const;
 
     // --- Saving: UReportDocSave.cpp ---------------------------------------------------------------------------------
@@ -366,13 +366,13 @@ public:
     bool OnSaveDocument(const QString &path) override;
     /// Why the last `OnSaveDocument` failed, as the end of a sentence; empty when it did not, or nothing is known.
     const QString &GetSaveProblem() const;
-    /// Saves through `OnSaveDocument`. @return 0 for an empty path, else 1, whether the save succeeded or not: callers go on
+    /// Saves through `OnSaveDocument`. @return 0 for an empty path, else 1, whether the save succeeded or not: callers continue
     /// either way. Who needs to know calls `OnSaveDocument`
     int SaveFile(const QString &path);
     /// Writes the text to an open device, in UTF-8. @return false as soon as a write fails
     bool WriteText(QIODevice &device, kareport::LineEnds lineEnds) const;
     /// Writes the text to an open device as a PDF. @param notes  receives what is missing or went wrong; may be null
-    /// @param progress  is told the pages done and all pages; its false stops the work. May be empty
+    /// @param progress  receives the pages done and all pages; its false stops the work. May be empty
     /// @return false when there is no measured page or no font, a write fails, or the work was stopped
     bool WritePdf(QIODevice &device, kareport::PdfNotes *notes = nullptr,
                   const std::function<bool(qint64, qint64)> &progress = {}) const;
@@ -394,7 +394,7 @@ public:
     // --- The text of a host's object: UReportDocTextObject.cpp ------------------------------------------------------
 
     /// Links the host document that takes the edited text, and the number of its object there. @param object  a `UDocument`
-    /// of the application, not owned; it may go before the report
+    /// of the application, not owned; it may be deleted before the report
     void SetTextObject(void *object, unsigned id);
     bool HasTextObj() const; ///< whether the number is not 0
     /// The host document that takes the edited text; null for none.

@@ -34,7 +34,7 @@ void UReportDoc::OnCloseDocument()
     if (!IsSearchAndOrganizeHandler() || IsAutoDelete()) {
         UDocument::OnCloseDocument();
     }
-    // The pane may have gone with the report's views.
+    // The pane may have been closed with the report's views.
     if (windowPane != nullptr && CViewPane::IsOpen(windowPane)) {
         windowPane->ClosePane();
     }

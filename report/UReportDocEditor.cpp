@@ -157,8 +157,8 @@ void UReportDoc::UpdateAllViews(UView *sender, long hint, void *hintObject)
                 showFrame(*this);
             }
         } else if (kareport::openInEditor(*this, editor) && IsReportAvailable(this)) {
-            // While it is being loaded, whoever loads it still needs it. What the editor did not get, because the disk is
-            // full or memory has ended, is nowhere else.
+            // While it is being loaded, the code that loads it still needs it. What the editor did not get, because
+            // the disk is full or memory ran out, is kept nowhere else.
             const bool isHandedOver = !HasLostText() && (IsEmpty() || !IsModified());
             if (isHandedOver && parts_->closeDocument && !parts_->isSerializing) {
                 OnCloseDocument();

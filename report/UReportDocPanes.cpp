@@ -16,7 +16,7 @@ using kareport::showsReport;
 namespace
 {
 
-/// Whether a pane has the title as its caption. No title is nobody's.
+/// Whether a pane has the title as its caption. An empty title is no pane's caption.
 bool isTaken(const QString &title, const QStringList &captions)
 {
     if (title.isEmpty()) {
@@ -47,7 +47,8 @@ const QString &UReportDoc::GetTitle() const
 void UReportDoc::SetTitle(const QString &title)
 {
     parts_->page.losesNothing([&] {
-        const QString given = title; // may be the very title that is numbered below
+        // It may be the very title that is numbered below. NOLINTNEXTLINE(performance-unnecessary-copy-initialization)
+        const QString given = title;
         QString &own = parts_->title;
         own = given;
         SetHeader();

@@ -87,7 +87,7 @@ bool saveText(UReportDoc &report, const QString &path, QString &problem)
 bool saveByName(UReportDoc &report, const QString &path, QString &problem)
 {
     if (report.HasLostText()) {
-        // It would put half a report in the place of a whole one, or nothing in the place of what was lost.
+        // It would replace a whole report by half of one, or what was lost by nothing.
         problem = Xlate("a part of the report was lost when memory ran out");
         return false;
     }
@@ -119,7 +119,7 @@ bool saveUnderChosenName(UReportDoc &report, const QString &path, bool replace)
         const kareport::WaitCursor cursor;
         isSaved = report.OnSaveDocument(name);
     }
-    // What it told of the save, or a view that was updated, may have closed the report.
+    // A notification of the save, or a view that was updated, may have closed the report.
     const bool isThere = UReportDoc::IsReportAvailable(&report);
     if (!isSaved) {
         kareport::sayNotSaved(name, isThere ? report.GetSaveProblem() : QString());
@@ -167,7 +167,7 @@ int UReportDoc::SaveFile(const QString &path)
         return 0;
     }
     OnSaveDocument(path);
-    return 1; // also when nothing was saved: hosts take a 0 for "no path" and go on with any other answer
+    return 1; // also when nothing was saved: hosts take a 0 for "no path" and continue with any other answer
 }
 
 bool UReportDoc::WriteText(QIODevice &device, kareport::LineEnds lineEnds) const

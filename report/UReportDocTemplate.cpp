@@ -14,7 +14,7 @@ bool writeData(kareport::PageWriter &page, Work write)
     if (page.losesNothing(write)) {
         return true;
     }
-    page.setHeading({QString(), 0, 2}); // a table's own must not stand over what is written next
+    page.setHeading({QString(), 0, 2}); // a table's own must not be the heading of what is written next
     return false;
 }
 
@@ -31,7 +31,7 @@ bool UReportDoc::LoadTemplateFile(const QString &path, const QString &templateNa
                                   const QString &blockName)
 {
     return kareport::whileMemoryLasts(false, [&] {
-        QStringList paths; // not made of its member in braces, which does not survive when memory ends
+        QStringList paths; // not made of its member in braces, which does not survive when memory runs out
         paths.append(path);
         return loadTemplate(paths, templateName, tableName, blockName);
     });

@@ -14,7 +14,7 @@ class ScanText
 {
 public:
     ScanText() = default;
-    /// A text of its own, whose characters stand where they are.
+    /// A text of its own: its characters are at their own positions.
     explicit ScanText(QString text);
 
     QStringView view() const { return text_; }
@@ -22,18 +22,18 @@ public:
     bool isEmpty() const { return text_.isEmpty(); }
     qsizetype size() const { return text_.size(); }
 
-    /// Appends characters that stand one behind the other from `source` on.
+    /// Appends characters that follow each other in the file from `source` on.
     void append(QStringView characters, qsizetype source);
     /// The `count` characters from `from` on.
     ScanText sliced(qsizetype from, qsizetype count) const;
     /// Takes `count` characters from `from` on out of the text; what is left closes up.
     void remove(qsizetype from, qsizetype count);
 
-    /// Where the character at a position (0 to `size()`) stood; the end stands behind the last character.
+    /// Where the character at a position (0 to `size()`) was; the end is after the last character.
     qsizetype sourceOf(qsizetype position) const;
 
 private:
-    /// From `at` on, up to the next run, the characters stood one behind the other from `source` on.
+    /// From `at` on, up to the next run, the characters followed each other from `source` on.
     struct Run
     {
         qsizetype at;

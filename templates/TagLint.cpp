@@ -17,7 +17,7 @@ constexpr std::array<QStringView, 25> elementNames = {
     u"Variable",       u"Dictionary", u"ID",           u"DictionaryName", u"VariableList", u"Type",  u"Blocks",
     u"Block",          u"Separator",  u"PageBreaks",   u"Options"};
 
-/// Longer than any tag that somebody means as one, attributes included.
+/// Longer than any text that is meant as a tag, attributes included.
 constexpr qsizetype longestTag = 200;
 constexpr qsizetype longestQuote = 40;
 
@@ -27,7 +27,7 @@ bool isElementName(QStringView name)
                        [name](QStringView known) { return equalFolded(known, name); });
 }
 
-/// What stands between "<" and ">" of the tag at a position; empty when there is no such text.
+/// What is between "<" and ">" of the tag at a position; empty when there is no such text.
 QStringView tagText(QStringView text, qsizetype at)
 {
     const QStringView rest = text.sliced(at + 1).first(std::min(longestTag, text.size() - at - 1));

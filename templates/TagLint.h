@@ -12,7 +12,7 @@ namespace kareport
 /// The usual spelling of an element's name, "ReportTemplate" for REPORTTEMPLATE; another name comes back as it is.
 QString elementName(QStringView tag);
 
-/// A piece of text that looks like a tag of a template and is none, or the other way round.
+/// A piece of text that looks like a tag of a template and is not, or the other way round.
 struct TagRemark
 {
     enum class Kind
@@ -22,7 +22,7 @@ struct TagRemark
     };
     Kind kind;
     qsizetype source; ///< where in the file
-    QString text;     ///< as it stands, cut short
+    QString text;     ///< unchanged, but shortened
 };
 
 std::vector<TagRemark> findIgnoredTags(const ScanText &file);

@@ -16,7 +16,7 @@ struct ScanNote
     enum class Kind
     {
         EmptyEndsList,    ///< an empty element ends a list: its later siblings are not read
-        ClosedBeforeOpen, ///< a closing tag stands before the opening tag: the element is not read
+        ClosedBeforeOpen, ///< a closing tag comes before the opening tag: the element is not read
         Unclosed,         ///< an opening tag without any closing tag: the element is not read
         RunsOn,           ///< the value holds another opening tag of the name: it ends at the first closing tag
         ShortCloseDrops   ///< what follows a short closing tag is dropped with it
@@ -31,19 +31,19 @@ using ScanNotes = std::vector<ScanNote>;
 /// An element that the scanner found.
 struct ScanElement
 {
-    ScanText value;        ///< what stands between the tags, as it stands
-    qsizetype source = -1; ///< where its opening tag stands in the file, the end of one that a cut has joined; -1 when
+    ScanText value;        ///< the text between the tags, unchanged
+    qsizetype source = -1; ///< where its opening tag is in the file (its end, if a cut has joined it); -1 when
                            ///< there is no such element
 
     bool exists() const { return source >= 0; }
 };
 
 /// The first element of a name in a text. An opening tag is exactly "<", the name in any case, and ">"; the closing tag
-/// is the first "</name>" of the whole text or, where there is none, the first "</>" behind the opening tag. A closing
-/// tag that stands before the opening tag leaves the element unread.
+/// is the first "</name>" of the whole text or, where there is none, the first "</>" after the opening tag. A closing
+/// tag that comes before the opening tag leaves the element unread.
 ///
-/// With `remove` the element is cut out of the text. As many characters go as a full closing tag has, also where the
-/// short one stood: templates in use are laid out for that.
+/// With `remove` the element is cut out of the text. As many characters are removed as a full closing tag has, also
+/// where the short one stood: templates in use are laid out for that.
 /// @param tag    the name in ASCII capitals
 /// @param notes  where to note what an author may not have meant; null for none
 ScanElement ExtractNode(ScanText &text, QStringView tag, bool remove, ScanNotes *notes = nullptr);
@@ -68,7 +68,7 @@ private:
     struct Opening
     {
         qsizetype at;    ///< position of the tag; before `position_` when it begins in what was kept
-        qsizetype value; ///< position behind the tag
+        qsizetype value; ///< position after the tag
     };
 
     std::optional<Opening> findOpening();
@@ -80,7 +80,7 @@ private:
     QStringView view_;
     QStringView tag_;
     ScanNotes *notes_;
-    qsizetype position_ = 0; ///< what stands before it was kept or cut out
+    qsizetype position_ = 0; ///< the text before it was kept or cut out
     QString kept_;           ///< what was kept so far: a cut can join its end with what follows to a tag
     qsizetype closing_ = -1;
     qsizetype shortClosing_ = notSearched; ///< looked for once it is needed: a file without any is walked to its end

@@ -20,7 +20,7 @@ struct TemplateRemark
     QString text;         ///< one sentence, translated
 };
 
-/// A width or a number of decimals above this is taken for a mistake.
+/// A width or a number of decimals above this counts as a mistake.
 inline constexpr qint32 widestColumn = 32767;
 
 /// Reads every template of a file as the module reads it and says what the module passes over in silence, in the order

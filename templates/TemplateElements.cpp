@@ -7,7 +7,7 @@ namespace
 {
 
 /// The parts of an element are cut out one after the other. Each cut changes what the next one sees, so the order of the
-/// cuts belongs to the format; the last one is only looked up, since nothing is read behind it.
+/// cuts belongs to the format; the last one is only looked up, since nothing is read after it.
 using FieldReader = FieldElement (*)(ScanElement element, ScanNotes *notes);
 
 FieldElement readTableField(ScanElement element, ScanNotes *notes)

@@ -63,14 +63,14 @@ struct TemplateElement
     ScanElement title;
 };
 
-/// The templates of a whole file, one after the other in file order, for whoever needs only some of them.
+/// The templates of a whole file, one after the other in file order, for code that needs only some of them.
 class TemplateSequence
 {
 public:
     /// The text must live as long as the sequence.
     explicit TemplateSequence(const ScanText &file, ScanNotes *notes = nullptr);
 
-    /// The next template; nothing behind the last one.
+    /// The next template; nothing after the last one.
     std::optional<TemplateElement> next();
 
 private:

@@ -23,10 +23,10 @@ public:
 
     /// Reads a file; nothing when it cannot be opened or read.
     static std::optional<TemplateFile> read(const QString &path);
-    /// Reads a file's text as it is scanned, for whoever need not say where in the file something stands.
+    /// Reads a file's text as it is scanned, for code that does not report places in the file.
     static std::optional<QString> readScanned(const QString &path);
 
-    /// The text as it stands.
+    /// The text as it is in the file.
     const QString &text() const { return text_; }
     /// The text that is scanned: without tabs, line feeds and carriage returns, which also values lose.
     ScanText scanText() const;

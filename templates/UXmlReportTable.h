@@ -32,7 +32,7 @@ public:
     void ReorderingHeading();
 
     /// Replaces `ids` by the dictionary identifiers of the sort keys, none when the table is not sorted.
-    /// @return false, with none, when memory ends
+    /// @return false, with none, when memory runs out
     bool GetSortList(std::vector<quint32> &ids) const;
 
     /// The column separator as a text of one character.

@@ -35,7 +35,7 @@ void CReportToolBar::addButton(unsigned id)
             asked->runCommand(id);
         }
     });
-    // A person without a mouse reaches the buttons with the Tab key.
+    // Without a mouse, the buttons are reached with the Tab key.
     widgetForAction(button)->setFocusPolicy(Qt::TabFocus);
 }
 
@@ -94,7 +94,7 @@ void CReportToolBar::changeEvent(QEvent *event)
 
 void CReportToolBar::showEvent(QShowEvent *event)
 {
-    showTips(); // by whoever overrides them, too
+    showTips(); // by classes that override them, too
     OnUpdateCmdUI(nullptr, true);
     QToolBar::showEvent(event);
 }

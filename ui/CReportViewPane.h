@@ -3,7 +3,7 @@
 #include "COneViewPane.h"
 #include "KaReportExport.h"
 
-/// The pane that a report's view stands in. Whether it may close is for its document to say, and not at all while an
+/// The pane that a report's view is in. Whether it may close is for its document to say, and not at all while an
 /// editor holds the report.
 class KAREPORT_EXPORT CReportViewPane : public COneViewPane
 {

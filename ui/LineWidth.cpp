@@ -11,7 +11,7 @@ namespace kareport
 namespace
 {
 
-/// Widths that are whole but for the rounding of a sum stay whole.
+/// Widths that are whole except for the rounding of a sum stay whole.
 constexpr qreal roundingError = 1e-3;
 
 constexpr bool isAscii(char16_t character)

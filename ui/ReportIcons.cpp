@@ -18,7 +18,7 @@ namespace
 /// Icons are drawn on a sheet of 16 units a side.
 constexpr qreal sheet = 16;
 constexpr qreal lineWidth = 1;
-/// What the guidelines for accessible graphics ask for.
+/// The contrast required by the guidelines for accessible graphics.
 constexpr qreal leastContrast = 3;
 
 using Draw = void (*)(QPainter &painter, const QColor &accent);
@@ -62,7 +62,7 @@ void drawPrinter(QPainter &painter, const QColor &accent)
     painter.drawRect(QRectF(4.5, 9.5, 7, 5));
 }
 
-/// How bright a colour is to the eye, from 0 to 1.
+/// The perceived brightness of a colour, from 0 to 1.
 qreal luminance(const QColor &color)
 {
     const auto linear = [](qreal part) {
@@ -97,7 +97,8 @@ public:
     {
         const QPalette palette = QGuiApplication::palette();
         const auto group = mode == QIcon::Disabled ? QPalette::Disabled : QPalette::Active;
-        // A highlight that is lost on the background, as a dark blue on dark grey, gives way to the text's colour.
+        // A highlight that does not show on the background, such as dark blue on dark grey, is replaced by the text's
+        // colour.
         QColor accent = palette.color(group, QPalette::Highlight);
         if (contrast(accent, palette.color(group, QPalette::Button)) < leastContrast) {
             accent = palette.color(group, QPalette::ButtonText);

@@ -19,7 +19,7 @@ public:
     explicit ReportLines(QObject *parent = nullptr);
     ~ReportLines() override;
 
-    /// Adds a line behind the last. @return false, with nothing added, when there is no memory
+    /// Adds a line after the last. @return false, with nothing added, when there is no memory
     bool append(QStringView line);
     /// Lines that were added, published or not.
     int count() const { return static_cast<int>(lines_.size()); }

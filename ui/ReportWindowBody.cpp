@@ -26,7 +26,7 @@ ReportWindowBody::ReportWindowBody(UReportWindowDlg *window)
     const DialogResource dialog = reportDialog(reportWindowDialog);
     setFont(dialog.font());
     list_->Create(this, pixelsOfDialogUnits(dialog.controlPlace, fontMetrics()), static_cast<int>(dialog.control));
-    // Whatever in the window has the keyboard, the window sees its keys first.
+    // The window sees all keys first, whichever widget in it has the keyboard.
     list_->installEventFilter(this);
     toolBar_->installEventFilter(this);
     for (QAction *button : toolBar_->actions()) {

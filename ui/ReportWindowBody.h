@@ -10,13 +10,13 @@ class UReportWindowDlg;
 namespace kareport
 {
 
-/// What stands in a report window: its bar above its list.
+/// The content of a report window: its bar above its list.
 class ReportWindowBody : public QWidget
 {
 public:
     explicit ReportWindowBody(UReportWindowDlg *window);
 
-    /// The window goes, or is closed, before its body does.
+    /// The window is destroyed, or closed, before its body.
     void leaveWindow();
 
     CReportToolBar &toolBar() const { return *toolBar_; }
@@ -36,7 +36,7 @@ protected:
     void hideEvent(QHideEvent *event) override;
 
 private:
-    UReportWindowDlg *window_; ///< null once it has gone
+    UReportWindowDlg *window_; ///< null once it has been destroyed
     CReportToolBar *toolBar_;
     UReportList *list_;
     QTimer updateTimer_;

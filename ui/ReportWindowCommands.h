@@ -13,7 +13,7 @@ namespace kareport
 UReportView *firstReportView(const UReportDoc &report);
 
 /// What the commands of a report's menus do while a report window has the keyboard: they act on the report that it shows, or
-/// are disabled. None of them goes on to a view of another report.
+/// are disabled. None of them is passed on to a view of another report.
 class ReportWindowCommands : public CommandTarget
 {
 public:

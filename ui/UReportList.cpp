@@ -18,7 +18,7 @@
 namespace
 {
 
-/// How long lines wait for others that come with them.
+/// How long lines are collected before they are shown.
 constexpr int flushInterval = 50; // milliseconds
 
 /// The sides of a rectangle that lie outside it, as its right and bottom one count here.
@@ -58,7 +58,7 @@ UReportList::UReportList(QWidget *parent)
     setTextElideMode(Qt::ElideNone);
     setVerticalScrollMode(ScrollPerPixel);
     setHorizontalScrollMode(ScrollPerPixel);
-    // The bar that every report soon needs stands there from the beginning: the lines do not move when it comes.
+    // The bar that every report soon needs is there from the beginning: the lines do not move when it comes.
     setVerticalScrollBarPolicy(Qt::ScrollBarAlwaysOn);
     setLayoutDirection(Qt::LeftToRight); // reports are laid out in columns from the left
     flushTimer_.setSingleShot(true);

@@ -16,9 +16,9 @@ class ReportLines;
 /// The list of a report window: one row a line, all of one height, as wide as its widest line. A line is never cut or
 /// abbreviated; what does not fit is reached with the horizontal scroll bar.
 ///
-/// Lines may come by the hundred thousand while nobody looks: they are shown together a moment after the first of them,
-/// and each costs the same however many are there. Whoever asks the list before that moment gets what holds with all
-/// lines in it.
+/// Lines may come by the hundred thousand while the list is not painted: they are shown together a moment after the
+/// first of them, and each costs the same however many are there. A caller who asks the list before that moment gets
+/// what holds with all lines in it.
 class KAREPORT_EXPORT UReportList : public QListView
 {
 public:
@@ -44,9 +44,9 @@ public:
 
     // --- Rows -------------------------------------------------------------------------------------------------------
 
-    /// Adds a line behind the last and makes it the current one.
+    /// Adds a line after the last and makes it the current one.
     void WriteLine(QStringView line);
-    /// Adds a line behind the last; the current one stays. The list becomes as wide as the line, if it is not.
+    /// Adds a line after the last; the current one stays. The list becomes as wide as the line, if it is not.
     /// @return its row, or −1 when there is no memory
     int AddString(QStringView line);
     /// How many lines were added.

@@ -96,7 +96,7 @@ void UReportList::updateGeometries()
 
 void UReportList::resizeEvent(QResizeEvent *event)
 {
-    // Whoever watches the newest line goes on seeing it, also when the horizontal bar comes and takes its height.
+    // A user who watches the newest line still sees it when the horizontal bar appears and takes some of the height.
     QScrollBar *bar = verticalScrollBar();
     const bool showsEnd = bar->maximum() > 0 && bar->value() == bar->maximum();
     QListView::resizeEvent(event);

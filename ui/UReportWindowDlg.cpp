@@ -203,7 +203,7 @@ void UReportWindowDlg::UpdateDocumentData()
         const qsizetype end = rest.indexOf(u'\r');
         QStringView line = end < 0 ? rest : rest.first(end);
         rest = end < 0 ? QStringView() : rest.sliced(end + 1);
-        // What goes with the blanks is also the line feed that the line before ended with.
+        // The line feed that ended the line before is removed with the blanks.
         while (!line.isEmpty() && line.front().isSpace()) {
             line = line.sliced(1);
         }

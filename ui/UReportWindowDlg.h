@@ -27,7 +27,7 @@ class ReportWindowCommands;
 /// The report window: a pane at the bottom of the main frame that shows the lines of a report as they are written, with
 /// buttons to save it, to open it in its own view and to print it once it is marked active.
 ///
-/// A window that is linked to a report (`UReportDoc::SetReportWindow`) is owned by it; any other by whoever made it. It
+/// A window that is linked to a report (`UReportDoc::SetReportWindow`) is owned by it; any other by the code that made it. It
 /// lives on while it is closed, and can be created again.
 class KAREPORT_EXPORT UReportWindowDlg : public CPropertyPane,
                                          public kareport::ReportWindow,
@@ -54,7 +54,7 @@ public:
     /// Closes the window, which can be created again: its lines are gone.
     void ClosePane() override;
     void OnSysCommand(unsigned command, long parameter) override;
-    /// The window never stands among the documents as a tab.
+    /// The window is never one of the tabs of the documents.
     bool CanBeTabbedDocument() const override { return false; }
     CViewPane *GetOwningPane() override { return isCreated() ? this : nullptr; }
     UDocument *GetShownDocument() const override;
@@ -69,7 +69,7 @@ public:
 
     /// Links the report that the window shows, which may be null. The list gets its font, so that its columns align.
     void SetReportDoc(UReportDoc *report);
-    /// The report; null when there is none or it has gone.
+    /// The report; null when there is none or it was closed.
     UReportDoc *GetReportDoc() const;
     /// Adds a line exactly as it is and makes it the current one. Nothing while the window is not created.
     void WriteLine(const QString &line) override;
@@ -90,7 +90,7 @@ public:
     /// after the answer takes it back.
     bool IsGivenUp() const;
     void takeFocus() override;
-    /// The view to go back to; null for none or when it has gone.
+    /// The view to go back to; null for none or when it was closed.
     UView *GetPreviousView() const;
     /// Brings the pane of that view to the front.
     void ActivatePreviousView();
@@ -122,7 +122,7 @@ private:
     QPointer<kareport::ReportWindowBody> body_; ///< null while the window is not created
     std::vector<kareport::Command> commands_;
     std::unique_ptr<kareport::ReportWindowCommands> menuCommands_;
-    UReportDoc *report_ = nullptr; ///< may have gone
+    UReportDoc *report_ = nullptr; ///< may have been destroyed
     std::unique_ptr<kareport::RememberedView> previousView_;
     bool active_ = false;
     std::optional<std::pair<quint64, qint64>> givenUp_; ///< the edits and the length of the report that was given up

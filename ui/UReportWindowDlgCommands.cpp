@@ -117,7 +117,7 @@ void UReportWindowDlg::ShowReport()
         if (CViewPane *pane = reportTemplate->CreateNewPane(report, nullptr, UReportDoc::ownPaneStyle, nullptr)) {
             reportTemplate->InitialUpdatePane(pane, report, 1);
             kareport::noteOwnPane(*pane, true);
-            kareport::closeOwnHiddenPanes(*report); // the report now stands in one that is shown
+            kareport::closeOwnHiddenPanes(*report); // the report is now in one that is shown
         }
     }
     report->UpdateAllViews(nullptr, 0, nullptr);

@@ -19,7 +19,7 @@ namespace kareport
 namespace
 {
 
-/// How long the text must rest before its matches are counted again.
+/// How long the text must stay unchanged before its matches are counted again.
 constexpr int recountDelay = 200; // milliseconds
 
 QToolButton *newButton(QWidget *parent, const QString &text, const QString &name, const QString &key)
@@ -131,7 +131,7 @@ void FindBar::searchChanged()
 
 void FindBar::watchDocument()
 {
-    // What has been counted is no longer true, and the places that were noted may be gone.
+    // What has been counted is no longer true, and the places that were noted may no longer exist.
     if (!isVisible()) {
         return;
     }

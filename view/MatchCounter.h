@@ -14,7 +14,7 @@ class QTextDocument;
 namespace kareport
 {
 
-/// Counts the matches of a search in a document, a slice at a time between the user's doings.
+/// Counts the matches of a search in a document, a slice at a time between the user's actions.
 class MatchCounter
 {
 public:

@@ -22,7 +22,7 @@ ReportEdit::ReportEdit(QWidget *parent) : QPlainTextEdit(parent)
 
 ReportEdit::~ReportEdit()
 {
-    // The document, a child, goes after the device that its layout measures with.
+    // The document, a child, is destroyed after the device that its layout measures with.
     document()->documentLayout()->setPaintDevice(nullptr);
 }
 

@@ -43,7 +43,7 @@ public:
     int loadedPercent() const { return loader_ ? loader_->percent() : 100; }
     /// Loads at once what is missing.
     void finishLoading();
-    /// Leaves what is missing out.
+    /// Leaves the missing part out.
     void stopLoading();
 
     /// @return what is wrong with the rich text; what was read up to there is shown
@@ -64,11 +64,11 @@ public:
     /// @return false, changing nothing, when the control does not hold the text that the edit was made in
     bool applyChange(const ReportChange &change);
 
-    /// The whole text, its lines ended by CR LF. What is missing of it is loaded first.
+    /// The whole text, its lines ended by CR LF. The missing part is loaded first.
     QString windowText();
     /// As the control's own, after all of the text has been loaded.
     void selectAll();
-    /// As the control's own. Where there is no memory for a copy, the clipboard and the text stay as they are, which is
+    /// As the control's own. Where there is no memory for a copy, the clipboard and the text stay as they are, and this is
     /// said.
     void copy();
     void cut();
@@ -99,7 +99,7 @@ protected:
 private:
     bool copySelection() const;
 
-    /// Where cursor and window stand.
+    /// Where the cursor and the window are.
     struct Place
     {
         int position;
@@ -127,20 +127,20 @@ private:
     QMetaObject::Connection watching_;
     std::unique_ptr<PieceLoader> loader_;
     std::function<void(bool)> loaded_; ///< called when `loader_` has done
-    Place wanted_ = {};                ///< where the window stood before, which may not have been loaded yet
+    Place wanted_ = {};                ///< where the window was before, which may not have been loaded yet
     int waiting_ = 0;                  ///< the cursor's position until then
     bool isScrolled_ = false;          ///< by the user, since loading began
-    QElapsedTimer sinceShown_;         ///< since the window was last told of a piece
+    QElapsedTimer sinceShown_;         ///< since the window was last notified of a piece
     bool isFollowing_ = false;
     int length_ = 0;
     int lineEnds_ = 0;
-    int keptLine_ = -1; ///< whose glyphs are kept, and those of the lines beside it
+    int keptLine_ = -1; ///< whose glyphs are kept, and those of the neighbouring lines
     int zoom_ = 100;
     int wheel_ = 0; ///< eighths of a degree turned since the last step
     QImage zoomDevice_;
 };
 
-/// Says that there was no memory for a copy.
+/// Reports that there was no memory for a copy.
 void sayNotCopied();
 
 } // namespace kareport

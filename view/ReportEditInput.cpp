@@ -64,7 +64,7 @@ void ReportEdit::zoomStep(int direction)
 void ReportEdit::applyZoom()
 {
     // Fonts stay as they are named. They are measured for a device of more dots, which scales the sizes that rich text
-    // names as well as the report's own, and the distance of tab stops. That stays too: printing goes by it.
+    // names as well as the report's own, and the distance of tab stops. That stays too: printing uses it.
     QAbstractTextDocumentLayout *layout = document()->documentLayout();
     const bool wasZoomed = layout->paintDevice() != nullptr;
     setTabStopDistance(kareport::tabColumns * QFontMetricsF(font()).horizontalAdvance(QLatin1Char('x')));
@@ -78,7 +78,7 @@ void ReportEdit::applyZoom()
         layout->setPaintDevice(&zoomDevice_);
     }
     if (wasZoomed || zoom_ != 100) {
-        document()->setDefaultFont(document()->defaultFont()); // lays the text out anew
+        document()->setDefaultFont(document()->defaultFont()); // lays the text out again
         viewport()->update();
     }
 }
@@ -127,7 +127,7 @@ void ReportEdit::wheelEvent(QWheelEvent *event)
         QPlainTextEdit::wheelEvent(event);
         return;
     }
-    // Fine wheels turn less than a step at a time.
+    // Fine wheels report less than a step at a time.
     wheel_ += event->angleDelta().y();
     for (; wheel_ >= wheelStep; wheel_ -= wheelStep) {
         zoomStep(1);
@@ -157,7 +157,7 @@ void ReportEdit::keepGlyphs(int line, bool on)
 
 void ReportEdit::paintEvent(QPaintEvent *event)
 {
-    // A key paints the cursor's line and touches those beside it. Finding their glyphs anew is most of the work.
+    // A key paints the cursor's line and touches the neighbouring ones. Finding their glyphs again is most of the work.
     if (const int line = textCursor().blockNumber(); line != keptLine_) {
         keepGlyphs(keptLine_, false);
         keptLine_ = line;

@@ -26,7 +26,7 @@ namespace kareport
 namespace
 {
 
-/// Shows a text in a label that is as wide as the widest of its texts so far. A label of one size lays nothing out anew,
+/// Shows a text in a label that is as wide as the widest of its texts so far. A label of one size lays nothing out again,
 /// neither here nor in the windows around it: that would happen at every key.
 void showIn(QLabel &label, const QString &text)
 {

@@ -87,7 +87,7 @@ private:
     QLabel *columnLabel_;
     QLabel *loadLabel_;
     QLabel *zoomLabel_;
-    QTimer placeTimer_; ///< shows the place anew
+    QTimer placeTimer_; ///< shows the place again
     std::function<int()> linesPerPage_;
     std::function<std::vector<int>()> pageStarts_;
     mutable PageLines pages_; ///< of the text of a document at a revision

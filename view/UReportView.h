@@ -35,14 +35,15 @@ struct PrintInfo
     QPrinter *printer = nullptr; ///< null until a printer has been prepared
     int curPage = 1;             ///< the page that is printed now, from 1
     int maxPage = 0;             ///< the last page; 0 when there is none
-    bool direct = false;         ///< nobody is asked for printer and pages
-    bool preview = false;        ///< shown on the screen: nobody is asked for printer and pages
+    bool direct = false;         ///< the user is not asked for printer and pages
+    bool preview = false;        ///< shown on the screen: the user is not asked for printer and pages
     /// The printer, where it has been prepared for the job and not been given.
     std::shared_ptr<QPrinter> ownPrinter;
 };
 } // namespace kareport
 
-/// The view of a report: its text in one control, in which the user may edit it. Every edit goes straight into the document.
+/// The view of a report: its text in one control, in which the user may edit it. Every edit is made in the document at
+/// once.
 class KAREPORT_EXPORT UReportView : public UView, public kareport::ReportViewPort, public kareport::CommandTarget
 {
 public:
@@ -63,7 +64,7 @@ public:
     kareport::ReportEdit &GetEdit() const;
     /// How lines are wrapped; not at all at first.
     WordWrap GetWordWrap() const { return m_nWordWrap; }
-    /// Whether the text was rich text when it was loaded: its formats may then stand in the control alone.
+    /// Whether the text was rich text when it was loaded: its formats may then be in the control alone.
     bool ShowsFormats() const { return showsFormats_; }
 
     /// Whether a long text is loaded in pieces when the view is updated, so that the window answers meanwhile. It is not
@@ -82,7 +83,7 @@ public:
     void OnChange();
     /// Makes the report the one that the user works with (`UApplication::SetCurrentReport`), when the keyboard comes to the view.
     void OnSetFocus();
-    /// A press of the mouse in the view's window makes the view the active one of the frame that it stands in.
+    /// A press of the mouse in the view's window makes the view the active one of the frame that it is in.
     void OnMouseActivate();
     /// Takes the view from the frame that it is the active one of; called when its window goes.
     void OnDestroy();
@@ -120,7 +121,7 @@ public:
     /// Prints the characters from `start` to `stop` (-1: to the end) as far as they fit a page.
     /// @return the first character that was not printed
     qint64 PrintPage(QPainter &painter, qint64 start, qint64 stop);
-    /// Draws the margins and line places of a page, to look at the print geometry.
+    /// Draws the margins and line places of a page, for checking the print geometry.
     void DrawMargins(QPainter &painter);
 
     /// The margins of the job, in twips (1/1440 inch).
@@ -160,7 +161,7 @@ private:
     void followEdit(const kareport::ReportChange &change);
     void noteLoaded();
     void noteShown();
-    bool isStale() const; ///< whether the document has changed since, and the view was not told
+    bool isStale() const; ///< whether the document has changed since, and the view was not notified
 
     QPointer<QWidget> widget_;
     kareport::ReportEdit *edit_ = nullptr; ///< owned by the widget
@@ -170,7 +171,7 @@ private:
     bool isMirrored_ = false;   ///< whether the document holds the control's text, its lines ended by CR LF
     qint64 loadedLength_ = -1;  ///< the document's length when the control was loaded from it or it from the control
     quint64 mirroredEdits_ = 0; ///< the document's edits by then
-    /// What other views are being told of: they take it over instead of the whole text. Null while nothing is told.
+    /// The edit that other views are being notified of: they take it over instead of the whole text. Null otherwise.
     const kareport::ReportChange *toldChange_ = nullptr;
     mutable std::vector<qint64> startLines_; ///< that pages begin with, of the document
     mutable quint64 startLinesEdits_ = 0;    ///< its edits by then
@@ -181,5 +182,5 @@ private:
     QMargins m_rectMargin; ///< twips
     QSize m_sizePaper;     ///< twips
     std::vector<qint64> m_aPageStart;
-    std::unique_ptr<kareport::PrintRun> run_; ///< of the job at hand
+    std::unique_ptr<kareport::PrintRun> run_; ///< of the current job
 };

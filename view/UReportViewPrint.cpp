@@ -33,7 +33,7 @@ using kareport::PrintResult;
 /// A preview keeps its pages in memory.
 constexpr int mostPreviewPages = 2000;
 
-/// The text of a view as a job begins with it. View, control and text may go while a window is open.
+/// The text of a view as a job begins with it. View, control and text may be destroyed while a window is open.
 class PrintedText
 {
 public:
@@ -140,7 +140,7 @@ void UReportView::OnReportPrint(bool direct)
         const PrintedText text(*this);
         const PrintOutcome outcome = printText(*this, *info.printer, info, 0);
         if (text.isOpen()) {
-            run_.reset(); // the printer goes, also where the job could not begin on it
+            run_.reset(); // the printer is destroyed, even if the job could not begin on it
         }
         sayOutcome(outcome, name);
     }
@@ -182,13 +182,13 @@ void UReportView::OnReportPrintPreview()
         }
     });
     if (text.isOpen()) {
-        run_.reset(); // the printer goes
+        run_.reset(); // the printer is destroyed
     }
 }
 
 bool UReportView::OnPreparePrinting(PrintInfo &info)
 {
-    run_.reset(); // a job that could not begin has left its own, made for a printer that may have gone
+    run_.reset(); // a job that could not begin has left its own, made for a printer that may no longer exist
     const UReportDoc *report = GetDocument();
     if (report == nullptr) {
         return false;
@@ -224,7 +224,7 @@ bool UReportView::OnPreparePrinting(PrintInfo &info)
             return false;
         }
         if (!isWanted) {
-            run_.reset(); // the printer goes
+            run_.reset(); // the printer is destroyed
             return false;
         }
     }
@@ -274,6 +274,6 @@ void UReportView::OnPageSetup()
             static_cast<kareport::ReportViewWidget *>(shown->widget_.data())->showPlace();
         }
     }
-    // After the measurement, which the next print command repeats: the report that is open keeps its pages till then.
+    // After the measurement, which the next print command repeats: the report that is open keeps its pages until then.
     SetReportPrinterSetToPortrait(UPreviewDlg::IsModulePrinterOrientationPortrait());
 }

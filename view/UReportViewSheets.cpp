@@ -73,7 +73,7 @@ void UReportView::OnPrint(QPainter &painter, PrintInfo &info)
     if (next >= GetEdit().document()->characterCount() - 1) {
         info.maxPage = info.curPage;
     } else if (info.curPage == pages && next > start) {
-        m_aPageStart.push_back(next); // a page that takes nothing would be followed by others for ever
+        m_aPageStart.push_back(next); // a page that takes nothing would be followed by others without end
     }
 }
 

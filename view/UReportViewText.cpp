@@ -14,7 +14,7 @@ using kareport::ReportEdit;
 namespace
 {
 
-/// Shorter texts are loaded before anybody notices.
+/// Shorter texts are loaded before the user notices.
 constexpr qint64 shortestPieced = 500'000;
 constexpr qint64 longestRichTextHead = 64;
 
@@ -23,7 +23,7 @@ constexpr qint64 longestRichTextHead = 64;
 void UReportView::OnUpdate(UView *sender, long hint, void *hintObject)
 {
     if (!widget_) {
-        return; // the window has gone before its view, as it does with a frame that closes
+        return; // the window was destroyed before its view, as when a frame closes
     }
     const auto *edited = hint == 0 && hintObject == nullptr ? dynamic_cast<const UReportView *>(sender) : nullptr;
     if (edited != nullptr && edited->toldChange_ != nullptr) {
@@ -77,7 +77,7 @@ void UReportView::noteLoaded()
 void UReportView::noteShown()
 {
     if (pane() == Pane::OwnHidden) {
-        setPane(Pane::OwnShown); // whoever has shown it: if it is hidden again, that is not the report's doing
+        setPane(Pane::OwnShown); // other code has shown it: if it is hidden again, the report did not do it
     }
     loadIfStale();
 }
@@ -108,7 +108,7 @@ bool UReportView::loadInPieces()
     showsFormats_ = false;
     noteLoaded();
     forgetPages();
-    // What a host appends meanwhile is shown with its next update. Any other change begins the load anew.
+    // What a host appends meanwhile is shown with its next update. Any other change starts the load again.
     const quint64 edits = report->GetEditCount();
     const auto read = [report, edits](qint64 at, qint64 count) {
         const bool isSame = UReportDoc::IsReportAvailable(report) && report->GetEditCount() == edits;
@@ -120,7 +120,7 @@ bool UReportView::loadInPieces()
             return;
         }
         if (!isWhole || GetDocument()->GetEditCount() != edits) {
-            UpdateData(true); // whoever waits for the whole text must not be handed a part of it
+            UpdateData(true); // code that waits for the whole text must not get a part of it
         } else {
             noteMirrored();
             loadedLength_ = length;
@@ -149,7 +149,7 @@ void UReportView::SetRTFText(const QString &text)
     isMirrored_ = false;
     const bool isTakenFromHere = GetDocument() != nullptr && takenEdits_ == GetDocument()->GetEditCount();
     if (showsFormats_ && isTakenFromHere && text == edit_->windowText()) {
-        return; // what was edited here has come back as the document's text: its formats stand in the control alone
+        return; // what was edited here has come back as the document's text: its formats are in the control alone
     }
     showsFormats_ = kareport::isRichText(text);
     if (showsFormats_) {
@@ -184,8 +184,8 @@ void UReportView::takeEdit(const ReportChange &change)
         report->GetTextLength() == change.documentLengthBefore() &&
         report->ReplaceText(change.documentPosition(), change.documentRemoved(), change.documentInserted());
     if (!isReplaced) {
-        // Rich text, other line ends, or a text that was changed without the view being told: the document takes over what
-        // the control shows, and every further edit as the change it is.
+        // Rich text, other line ends, or a text that was changed without the view being notified: the document takes
+        // over what the control shows, and every further edit as the change it is.
         takeChanged(change);
         report->SetModifiedFlag(true);
     }
@@ -205,7 +205,7 @@ void UReportView::followEdit(const ReportChange &change)
 {
     const UReportDoc *report = GetDocument();
     if (report == nullptr || (isMirrored_ && !isStale())) {
-        return; // it has followed already, in a view that was told of the same edit twice
+        return; // it has followed already, in a view that was notified of the same edit twice
     }
     // A view that shows formats, or an image, shows another text than the one that was edited: what the document holds now
     // is plain.

@@ -5,7 +5,7 @@
 namespace kareport
 {
 
-/// Commands of the main window beside those of the menu of reports (`ReportCommandId`).
+/// Commands of the main window in addition to those of the menu of reports (`ReportCommandId`).
 enum DeskCommandId : unsigned
 {
     fileFromTemplateCommand = 33250,

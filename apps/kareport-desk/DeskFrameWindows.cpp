@@ -33,7 +33,7 @@ CViewPane *reportWindowPane(const UDocument &document)
                                                                      : nullptr;
 }
 
-/// Whether a report is the rich text that was made of another one for a word processor. Its text is the other's.
+/// Whether a report is the rich text that was made of another one for a word processor. It has the other report's text.
 bool isCopyForWordProcessor(const UReportDoc &report)
 {
     return report.GetRTFDataFlag() && report.GetTitle().isEmpty() && !report.IsModified();
@@ -60,7 +60,7 @@ void DeskFrame::activate(UDocument *report)
 
 void DeskFrame::closeUnseen()
 {
-    // Whoever has opened a dialog may still need the report that it is about.
+    // The code that has opened a dialog may still need the report that it is about.
     if (QApplication::activeModalWidget() != nullptr || kareport::isJobRunning()) {
         return;
     }
@@ -114,13 +114,13 @@ void DeskFrame::newWindow()
 
 void DeskFrame::dockAll(const std::function<void(QDockWidget *, QDockWidget *)> &join)
 {
-    layout()->setEnabled(false); // each pane would lay all others out anew: once, at the end, is enough
+    layout()->setEnabled(false); // each pane would lay all others out again: once, at the end, is enough
     QDockWidget *before = nullptr;
     for (QDockWidget *dock : findChildren<QDockWidget *>(QString(), Qt::FindDirectChildrenOnly)) {
         const auto *paneDock = dynamic_cast<kareport::PaneDock *>(dock);
         if (dock->isHidden() || paneDock == nullptr || paneDock->pane() == nullptr ||
             !paneDock->pane()->CanBeTabbedDocument()) {
-            continue; // panes beside the reports keep their places
+            continue; // panes next to the reports keep their places
         }
         dock->setFloating(false);
         if (before == nullptr) {
@@ -160,7 +160,7 @@ void DeskFrame::saveLayout()
     }
     for (QWidget *window : findChildren<QWidget *>(QString(), Qt::FindDirectChildrenOnly)) {
         if (window->inherits("QDockWidgetGroupWindow")) {
-            delete window; // it is empty, and would go a moment later
+            delete window; // it is empty, and would be deleted a moment later
         }
     }
     WriteProfileString(QString(), geometryEntry, QString::fromLatin1(saveGeometry().toBase64()));

@@ -25,7 +25,7 @@ struct DeskPreferences
     JobDefaults jobDefaults() const;
 };
 
-/// Reads the preferences from the user's profile. What stands there and cannot be understood counts as not chosen.
+/// Reads the preferences from the user's profile. An entry that cannot be understood counts as not chosen.
 DeskPreferences loadPreferences();
 void savePreferences(const DeskPreferences &preferences);
 

@@ -10,7 +10,7 @@ class QPushButton;
 namespace kareport
 {
 
-/// Asks whether reports are shown in a program of the user's choice, and in which.
+/// Asks whether reports are shown in a program of the user's choice, and which.
 class EditorPage : public QWidget
 {
 public:

@@ -15,7 +15,7 @@ namespace kareport
 class FileWatch
 {
 public:
-    /// @param changed  called a moment after a change, so that a file written in pieces is told once
+    /// @param changed  called a moment after a change, so that a file written in pieces is reported once
     explicit FileWatch(std::function<void(const QString &path)> changed);
 
     /// Watches a file, as it is now: what it holds was read or written by this program.

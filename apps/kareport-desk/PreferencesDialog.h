@@ -15,7 +15,7 @@ class EditorPage;
 class PageSetupForm;
 class UnitsPage;
 
-/// Asks for what holds for all reports.
+/// Asks for the settings of all reports.
 class PreferencesDialog : public QDialog
 {
 public:

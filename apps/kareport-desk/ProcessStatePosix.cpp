@@ -8,7 +8,7 @@ namespace kareport
 
 bool isProcessRunning(qint64 process)
 {
-    // Signal 0 only asks; a process of somebody else may not be asked, but is there.
+    // Signal 0 only asks; another user's process must not be asked, but exists.
     return process > 0 && (::kill(static_cast<pid_t>(process), 0) == 0 || errno == EPERM);
 }
 

@@ -15,7 +15,7 @@ namespace kareport
 {
 
 /// The folder in which one program keeps what it has open: a list, the texts that the list names, and a lock that says
-/// whether the program runs. What else is there is somebody else's: nothing is read, written or removed through a link, and
+/// whether the program runs. Other files are not ours: nothing is read, written or removed through a link, and
 /// only what has the names of these files is removed.
 class RecoveryFolder
 {
@@ -41,7 +41,8 @@ public:
     bool writeList(const QByteArray &bytes) const;
     /// Removes a text.
     void removeText(const QString &name) const;
-    /// Removes list and texts. The folder goes as well when nothing else is in it, at the latest with `removeIfEmpty`.
+    /// Removes list and texts. The folder is removed as well when nothing else is in it, at the latest with
+    /// `removeIfEmpty`.
     void removeFiles() const;
     void removeIfEmpty() const;
 

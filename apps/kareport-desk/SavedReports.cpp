@@ -25,7 +25,7 @@ namespace kareport
 namespace
 {
 
-/// The text of a report file as it was before it was saved: each line end once, and UTF-8 as the characters that it stands
+/// The text of a report file as it was before it was saved: each line end once, and UTF-8 as the characters that it encodes
 /// for. Rich text, and what is no UTF-8, is another text, which the report loads byte by byte. A name that rich text has says
 /// nothing: without a view that could write that, the report text is saved under it.
 TextFile readReportFile(const QString &path, UserInput input)
@@ -44,7 +44,7 @@ struct OtherText
     bool isFromRtf = false;
 };
 
-/// Reads one into a report that nobody sees. @return why it was not read; nothing when it was
+/// Reads one into a hidden report. @return why it was not read; nothing when it was
 std::optional<QString> readOther(const QString &path, OtherText &other)
 {
     if (QFileInfo(path).size() > UView::nMaxSize) {
@@ -81,10 +81,10 @@ QStringList keepPageLength(UReportDoc &report)
     return warnings;
 }
 
-/// Puts a text in the place of what a report holds.
+/// Replaces what a report holds by a text.
 void put(UReportDoc &report, LoadedText &loaded, bool isFromRtf)
 {
-    // A window that shows the report while it is written is told line by line.
+    // A window that shows the report while it is written is given every line.
     const bool isWatched = report.GetReportWindow() != nullptr;
     const QString copy = isWatched ? loaded.text.piece(0, loaded.text.size()) : QString();
     report.Clear();
@@ -112,7 +112,8 @@ bool show(UReportDoc &report)
     return !report.HasLostText();
 }
 
-/// A page length that only the text told goes with the text. One that was given otherwise, as by a job, stays.
+/// A page length that was only derived from the text is dropped with the text. One that was set otherwise, as by a
+/// job, stays.
 void forgetPageLengthOfText(UReportDoc &report)
 {
     const std::optional<int> given = report.GetGivenLinesPerPage();
@@ -129,7 +130,7 @@ bool reload(UReportDoc &report, ReadNotes &notes)
     if (!whyNotOpened(path).isEmpty() || !QFile(path).open(QIODevice::ReadOnly)) {
         return false; // what is shown is then all that there is
     }
-    // What the user types until the file has been read would go with the text before it.
+    // What the user types until the file has been read would be lost with the text before it.
     const TextFile read = readReportFile(path, UserInput::Kept);
     notes.isStopped = read.state == TextFile::State::Stopped;
     notes.problem = read.problem;

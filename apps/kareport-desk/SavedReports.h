@@ -10,10 +10,10 @@ namespace kareport
 
 /// Why a file cannot be opened; empty when it may be tried. Reading a pipe or a device might never end.
 QString whyNotOpened(const QString &path);
-/// What is to be said of a file that was read.
+/// The remarks on a file that was read.
 struct ReadNotes
 {
-    bool isStopped = false; ///< by the user; nothing more is to be said
+    bool isStopped = false; ///< by the user; there is no further message
     QString problem; ///< why it was not read, as a part of a sentence; empty where it was, or where nothing is known
     QStringList warnings; ///< sentences about what the file holds and the report does not show
 };

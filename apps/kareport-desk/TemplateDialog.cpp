@@ -178,7 +178,7 @@ void TemplateDialog::check()
         message = Xlate("There is no data file \"%1\".").arg(data_->text());
     }
     if (!message.isEmpty()) {
-        message[0] = message[0].toUpper(); // what is wrong with a file is said as the end of a sentence
+        message[0] = message[0].toUpper(); // the error of a file is the end of a sentence
     }
     message_->setText(message);
     buttons_->button(QDialogButtonBox::Ok)

@@ -14,7 +14,7 @@ namespace kareport
 namespace
 {
 
-/// A shorter file is read before anybody notices.
+/// A shorter file is read before the user notices.
 constexpr qint64 shortestAside = qint64(8) << 20;
 
 TextFile::State stateOf(TextLoading loading)

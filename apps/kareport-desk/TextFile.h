@@ -27,7 +27,7 @@ struct TextFile
     QString problem = {};             ///< why it was not read, as a part of a sentence
 };
 
-/// Turns a file's bytes into a text, on whatever thread.
+/// Turns a file's bytes into a text, on any thread.
 using LoadText = std::function<TextLoading(QByteArrayView bytes, LoadedText &loaded,
                                            const std::function<bool(qint64 done)> &proceed)>;
 

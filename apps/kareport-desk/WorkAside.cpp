@@ -42,7 +42,7 @@ public:
         const std::lock_guard lock(mutex_);
         return isDone_;
     }
-    /// Nobody waits for it any more.
+    /// Nothing waits for it any more.
     void leave()
     {
         const std::lock_guard lock(mutex_);
@@ -62,7 +62,7 @@ std::vector<std::shared_ptr<Waited>> &waited()
     return all;
 }
 
-/// What is done once nobody waits.
+/// What is done once nothing waits.
 struct Later
 {
     QPointer<QObject> context;
@@ -118,7 +118,7 @@ void start(const std::shared_ptr<Waited> &state, std::function<void(AsideState &
         threads().end();
     };
     try {
-        // A disk that does not answer any more keeps a thread for as long as it likes, and nobody waits for that.
+        // A disk that does not answer any more keeps a thread indefinitely, and nothing waits for that.
         std::thread(whole).detach();
     } catch (const std::system_error &) {
         whole();

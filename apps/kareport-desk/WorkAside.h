@@ -11,11 +11,11 @@ class QObject;
 namespace kareport
 {
 
-/// What a piece of work on another thread and whoever waits for it share.
+/// What work on another thread and the code that waits for it share.
 class AsideState
 {
 public:
-    /// Whether the work is to end, as nobody waits for it any more.
+    /// Whether the work is to end, because nothing waits for it any more.
     bool isStopped() const { return isStopped_; }
     void stop() { isStopped_ = true; }
     /// How far the work has come.
@@ -35,18 +35,18 @@ enum class UserInput
 };
 
 /// Does work on another thread while the windows answer. When it takes longer than a moment it is shown, and the user can
-/// stop it. Where there is no other thread to be had, the work is done on this one.
-/// @param what  said of the work while it is shown
-/// @param work  must own all that it touches, and let no exception out: when it is stopped nobody waits for its end
+/// stop it. If no other thread can be started, the work is done on this one.
+/// @param what  the text that is shown for the work
+/// @param work  must own all that it touches, and let no exception out: when it is stopped, nothing waits for its end
 /// @return false when it was stopped
 bool doAside(const QString &what, UserInput input, const std::function<void(AsideState &)> &work);
 
-/// Stops all work that somebody waits for. @param then  is done from the event loop, once nobody waits any more; not when
-/// the context has gone by then
+/// Stops all work that is being waited for. @param then  is done from the event loop, once nothing waits any more; not when
+/// the context has been destroyed by then
 /// @return false, with `then` forgotten, when there is no work
 bool stopWorkAside(QObject *context, const std::function<void()> &then);
 
-/// Waits for the end of what was stopped, so that the program does not go away under it. Work that waits for a disk which
+/// Waits for the end of what was stopped, so that the program does not end under it. Work that waits for a disk which
 /// does not answer is left alone.
 void waitForStoppedWork();
 

@@ -16,7 +16,7 @@ WorkDialog::WorkDialog(QWidget *parent, const std::function<void()> &stop)
 {
     dialog_->setLabel(plainLabel()); // it names files
     dialog_->setWindowModality(Qt::ApplicationModal);
-    // Only this class says when it comes and goes: while it is not there, nothing keeps the user from other windows.
+    // Only this class shows and hides it: while it is hidden, nothing keeps the user from other windows.
     dialog_->setMinimumDuration(INT_MAX);
     dialog_->setAutoReset(false);
     dialog_->setAutoClose(false);

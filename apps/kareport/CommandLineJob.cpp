@@ -24,7 +24,7 @@ namespace kareport
 namespace
 {
 
-/// A report of so many bytes is worth a word before it is made.
+/// A report of this many bytes is announced before it is made.
 constexpr qint64 largeReport = qint64(100) << 20;
 
 } // namespace
@@ -78,7 +78,7 @@ QString CommandLineJob::notesFile() const
                                     : file.replace(QStringLiteral("{}"), QFileInfo(source_.path()).completeBaseName());
 }
 
-/// No output may take the place of what the report is made of, or of another output.
+/// No output may replace what the report is made of, or another output.
 void CommandLineJob::checkOutputs()
 {
     const auto clash = outputClash(job_, source_.path());
@@ -209,7 +209,7 @@ bool CommandLineJob::writeNotes(const JobNotes &notes)
     return isWritten;
 }
 
-/// Makes the report straight into its output. @return nothing, and nothing made, when the output cannot be opened
+/// Writes the report directly into its output. @return nothing, and nothing made, when the output cannot be opened
 std::optional<ExitStatus> CommandLineJob::runIntoOutput(JobRunner &runner, UReportDoc &report, const Output &output,
                                                         Progress &progress)
 {
@@ -217,7 +217,7 @@ std::optional<ExitStatus> CommandLineJob::runIntoOutput(JobRunner &runner, URepo
     bool isMade = false;
     bool isEmpty = false;
     std::optional<InputError> inputError;
-    const bool isReport = output.kind == OutputKind::Report; // an empty one makes no file
+    const bool isReport = output.kind == OutputKind::Report; // an empty report makes no file
     const auto problem = replaceOutput(output, [&](QIODevice &device, QString & /*problem*/) {
         isOpen = true;
         ReportTextWriter writer(device, isReport ? LineEnds::ReportFile : LineEnds::PlainText);
@@ -235,7 +235,7 @@ std::optional<ExitStatus> CommandLineJob::runIntoOutput(JobRunner &runner, URepo
         return std::nullopt;
     }
     progress.finish();
-    // What comes when the report is made is too late to stop it.
+    // An interrupt after the report is made is too late to stop it.
     return isMade ? sayWritten(output, {isEmpty && isReport ? std::nullopt : problem}, isEmpty, command_.quiet)
                   : madeStatus(report, inputError);
 }
@@ -245,7 +245,7 @@ ExitStatus CommandLineJob::run(Progress &progress)
     if (checkSize() != exitDone) {
         return status_;
     }
-    // It belongs to nobody else: neither the user's preferences nor a printer are asked for it.
+    // It is not a user's report: neither the user's preferences nor a printer are asked for it.
     UReportDoc report(surroundingsOf(job_));
     JobRunner runner(job_, source_, progress);
     runner.stopWhen([&] { return isReaderGone() || isTooLarge(report); });

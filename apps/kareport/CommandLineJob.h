@@ -14,7 +14,7 @@ namespace kareport
 class CommandLineJob
 {
 public:
-    /// Reads a job. What is wrong with it is said on standard error, and shows in `status`.
+    /// Reads a job. Errors are reported on standard error and in `status`.
     CommandLineJob(const RenderCommand &command, Expected<JsonSource> source);
 
     /// `exitDone` while nothing is wrong with the job.

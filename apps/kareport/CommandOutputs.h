@@ -11,7 +11,7 @@ namespace kareport
 /// Says on standard error what went wrong with an output or, unless `quiet`, that an empty report makes no file.
 ExitStatus sayWritten(const Output &output, const OutputResult &result, bool isEmpty, bool quiet);
 
-/// Writes a report to each of its outputs, and says on standard error what goes wrong and, unless `quiet`, what a reader
+/// Writes a report to each of its outputs, and reports on standard error what goes wrong and, unless `quiet`, what a reader
 /// should know. An output that cannot be written does not keep the others from being written.
 ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, Progress &progress, bool quiet);
 

@@ -48,7 +48,7 @@ ExitStatus usageExit(const QString &text)
 
 std::unique_ptr<QCoreApplication> startQt(int &argc, char **argv, bool withFonts)
 {
-    // What Qt has to say about its surroundings (no session, no screen) is nothing to a person who renders a report.
+    // What Qt reports about its surroundings (no session, no screen) does not matter to a person who renders a report.
     qInstallMessageHandler([](QtMsgType type, const QMessageLogContext &, const QString &text) {
         if (type == QtCriticalMsg || type == QtFatalMsg) {
             printError(QStringLiteral("kareport: ") + text);

@@ -12,7 +12,7 @@
 namespace kareport
 {
 
-/// What the program answers to its caller.
+/// The exit status of the program.
 enum ExitStatus
 {
     exitDone = 0,
@@ -92,7 +92,7 @@ struct ViewCommand
 {
     QString file;
 
-    /// Starts the desktop program and leaves it to itself.
+    /// Starts the desktop program and does not wait for it.
     ExitStatus run(int &argc, char **argv) const;
 };
 

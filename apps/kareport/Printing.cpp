@@ -42,7 +42,7 @@ QString visibleText(const QString &text)
 
 void printLine(const QString &line)
 {
-    // A tab stands between the columns of a list.
+    // The columns of a list are separated by a tab.
     QStringList columns = line.split(u'\t');
     for (QString &column : columns) {
         column = visibleText(column);

@@ -5,9 +5,9 @@
 namespace kareport
 {
 
-/// Takes what is shown of any progress off standard error, so that something else can be printed.
+/// Removes any progress line from standard error, so that something else can be printed.
 void eraseProgress();
-/// Whether there is something to take off. A signal's handler may ask.
+/// Whether there is a progress line to remove. A signal handler may call it.
 bool isProgressShown();
 
 /// Shows how far long work has come in a line on standard error.
@@ -17,7 +17,7 @@ public:
     explicit TerminalProgress(bool shown) : Progress(shown) {}
     ~TerminalProgress() override { TerminalProgress::finish(); }
 
-    /// The line goes, unless the work is one of many.
+    /// Removes the line, unless the work is one of many.
     void finish() override;
 
 protected:

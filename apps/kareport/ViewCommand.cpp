@@ -14,7 +14,7 @@ namespace kareport
 namespace
 {
 
-/// The desktop program: the one beside this program, else the one on the path.
+/// The desktop program: the one in this program's folder, else the one on the path.
 QString deskProgram()
 {
     const QString name = QStringLiteral("kareport-desk");

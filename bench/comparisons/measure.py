@@ -77,7 +77,7 @@ def _wait(process, deadline):
 
 
 def in_turn(commands, folder, runs, slow=20):
-    """Runs every command `runs` times, one after the other and again, behind a first turn that only warms up. A command
+    """Runs every command `runs` times, one after the other and again, after a first turn that only warms up. A command
     whose warm-up takes more than `slow` seconds is run once more. What a command has printed to its file is removed: memory
     holds it."""
     results = {command.name: Result(command.name, command.ours, command.bound) for command in commands}

@@ -38,7 +38,7 @@ PARTS = [
 
 
 def benchmarks(surroundings, pattern, repetitions, mixed=True):
-    """The runs of each benchmark, by its name. @param mixed  in turn; otherwise all of one behind each other, for
+    """The runs of each benchmark, by its name. @param mixed  in turn; otherwise all of one after the other, for
     benchmarks that leave their memory in a state that the others pay for"""
     command = [f"{surroundings.bench}/ka_bench", f"--benchmark_filter={pattern}", "--benchmark_format=json",
                f"--benchmark_repetitions={repetitions}", f"--benchmark_enable_random_interleaving={str(mixed).lower()}"]

@@ -1,4 +1,4 @@
-// A plain Qt program: reports stand in the tabs of its own main window, beside what else it shows. With --once it closes its
+// A plain Qt program: reports are in the tabs of its own main window, beside what else it shows. With --once it closes its
 // window again at once, which shows that it ends.
 #include <KaReport/AppMessageBox.h>
 #include <KaReport/CViewPane.h>

@@ -38,7 +38,7 @@ constexpr Range wideRanges[] = {
     {0x20000, 0x3134A},
 };
 
-/// Default_Ignorable_Code_Point, in order, but for the soft hyphen, which faces show as a hyphen.
+/// Default_Ignorable_Code_Point, in order, except the soft hyphen, which faces show as a hyphen.
 constexpr Range ignorableRanges[] = {
     {0x034F, 0x034F}, {0x061C, 0x061C}, {0x180B, 0x180F}, {0x200B, 0x200F},   {0x202A, 0x202E},
     {0x2060, 0x206F}, {0xFE00, 0xFE0F}, {0xFEFF, 0xFEFF}, {0xE0000, 0xE0FFF},

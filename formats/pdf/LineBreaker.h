@@ -11,7 +11,7 @@ namespace kareport
 /// The advance of a character in thousandths of the font size.
 using CharacterWidth = std::function<int(char32_t)>;
 
-/// Breaks a line that is wider than its box: after the last blank that stands in it or that crosses its edge, and in the
+/// Breaks a line that is wider than its box: after the last blank that is in it or that crosses its edge, and in the
 /// middle of a word only where the word alone is wider than the box. Blanks at the end of the line take no room.
 /// @param width  of the box, in thousandths of the font size
 /// @param pieces  receives the pieces, at least one; together they are the line

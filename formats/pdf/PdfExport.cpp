@@ -55,7 +55,7 @@ public:
         if (!pdf_.expectPages(sheets) || !addPages(pages) || !typesetter_.finish()) {
             return fail(libraryError());
         }
-        // A device that fails says why itself.
+        // A device that fails reports the reason itself.
         return pdf_.save(device) || (pdf_.isGood() ? false : fail(libraryError()));
     }
 
@@ -115,7 +115,7 @@ private:
         qint64 done = 0;
         for (const ReportPage &page : pages) {
             const auto begin = static_cast<qsizetype>(page.begin);
-            lineNumber_ += text_.sliced(at, begin - at).count(u'\n'); // lines that stand on no page
+            lineNumber_ += text_.sliced(at, begin - at).count(u'\n'); // lines that are on no page
             at = static_cast<qsizetype>(page.end);
             if (!addPage(begin, at)) {
                 return false;
@@ -190,7 +190,7 @@ private:
     qint64 cellsAcross_ = 0;
     std::unordered_map<char32_t, std::size_t> missingAt_; ///< place among the notes
     qint64 lineNumber_ = 0;
-    std::deque<QString> lines_; ///< of the page at hand, used again for every page
+    std::deque<QString> lines_; ///< of the current page, reused for every page
     std::vector<QStringView> pieces_;
 };
 

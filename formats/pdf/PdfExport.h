@@ -16,20 +16,20 @@ class QIODevice;
 namespace kareport
 {
 
-/// What a PDF is made of besides its text.
+/// What a PDF is made from besides its text.
 struct PdfOptions
 {
     PdfPageSetup page;
     std::vector<qint64> pageStarts;         ///< where its pages begin, for `reportPages`
     std::optional<QStringList> fontFolders; ///< where the preferred faces are looked for; nothing for the system's
-    std::function<bool(qint64, qint64)> progress; ///< is told the pages done and all pages; false stops. May be empty
+    std::function<bool(qint64, qint64)> progress; ///< receives the pages done and all pages; false stops. May be empty
 };
 
 /// Writes report text as a PDF to an open device, in a fixed-pitch face that is embedded: each page on a sheet of its own.
-/// Characters stand on the grid of that face; one that it lacks is taken from another face and put into its cell, or into
+/// Characters are on the grid of that face; one that it lacks is taken from another face and put into its cell, or into
 /// its two cells when it is a wide one. The widest line decides the type size of all pages, and a page with more lines than
 /// a sheet takes is set smaller; type gets no smaller than `smallestType`. Wider lines are broken at the edge of the box, and
-/// longer pages go on on further sheets. The same text gives the same bytes. Tabs lead to every eighth cell; other control
+/// longer pages continue on further sheets. The same text gives the same bytes. Tabs lead to every eighth cell; other control
 /// characters are not shown.
 /// @param notes  receives what is missing or went wrong; may be null
 /// @return false when the page has not been measured, no face can be used, the library fails, or a write fails

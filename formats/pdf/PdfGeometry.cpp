@@ -14,7 +14,7 @@ constexpr double pointsPerInch = 72;
 constexpr double hundredthsPerInch = 2540;
 /// The smallest distance and size that the numbers of a PDF can still say.
 constexpr double smallest = 0.01;
-/// The closest that lines stand, in font heights: closer, and descenders would run into what is below.
+/// The smallest distance of lines, in font heights: closer, and descenders would run into what is below.
 constexpr double closest = 0.75;
 /// What the last place of a calculation may take from a number of lines or cells.
 constexpr double rounding = 1e-4;

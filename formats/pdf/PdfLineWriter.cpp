@@ -11,7 +11,7 @@ namespace
 {
 
 constexpr int decimals = 4;
-/// Nearer than this, in thousandths of the font size, a glyph stands where it has to.
+/// A glyph within this distance of its place, in thousandths of the font size, needs no move.
 constexpr double nearEnough = 0.01;
 /// Arrays of a PDF have 8191 entries at most.
 constexpr int longestArray = 4000;

@@ -14,7 +14,7 @@ void addPdfNumber(QByteArray &operators, double number);
 /// Writes the codes of a text as a string, of two bytes each.
 void addPdfString(QByteArray &operators, QStringView codes);
 
-/// Writes a line of text glyph by glyph, each where it has to stand.
+/// Writes a line of text glyph by glyph, each where it has to be.
 class PdfLineWriter
 {
 public:
@@ -41,7 +41,7 @@ private:
     std::size_t font_ = 0;
     double rise_ = 0;
     double stretch_ = 1;
-    double pen_ = 0;  ///< where the next glyph would stand
+    double pen_ = 0;  ///< where the next glyph would be
     int entries_ = 0; ///< of the open array
     bool isArrayOpen_ = false;
     QString string_; ///< codes that follow each other

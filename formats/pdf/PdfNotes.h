@@ -14,8 +14,8 @@ namespace kareport
 struct MissingCharacter
 {
     char32_t character = 0; ///< its code point
-    qint64 count = 0;       ///< how often it stands in the report
-    qint64 firstLine = 0;   ///< where it stands first, from 1
+    qint64 count = 0;       ///< how often it is in the report
+    qint64 firstLine = 0;   ///< where it is first, from 1
 };
 
 /// Lines that are too wide for a page.
@@ -26,12 +26,12 @@ struct PdfWideLines
     double points = 0;    ///< the type size that they led to
 };
 
-/// What there is to say about a PDF.
+/// The remarks on a PDF.
 struct KAREPORT_EXPORT PdfNotes
 {
     PdfWideLines reduced;                  ///< lines that made the type of the whole PDF smaller
     PdfWideLines broken;                   ///< lines that had to be broken all the same
-    std::vector<MissingCharacter> missing; ///< in the order in which they occur; U+FFFD or "?" stands in their places
+    std::vector<MissingCharacter> missing; ///< in the order in which they occur; U+FFFD or "?" takes their place
     QString problem;                       ///< one sentence, when the PDF could not be made
 
     /// Sentences about wide lines and missing characters, for a person.

@@ -10,7 +10,7 @@ namespace kareport
 {
 
 /// Turns a line of a report, without its line feed, into what is seen of it: tabs become blanks up to the next eighth
-/// cell, other control characters and blanks at the end go, and half a surrogate pair becomes U+FFFD.
+/// cell, other control characters and blanks at the end are dropped, and half a surrogate pair becomes U+FFFD.
 void visibleLine(QStringView line, QString &visible);
 void visibleLine(QLatin1StringView line, QString &visible);
 

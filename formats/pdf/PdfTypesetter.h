@@ -58,7 +58,7 @@ private:
     std::vector<bool> isPlain_; ///< by character: one of the first face that fills one cell, as it is
     PdfClusters clusters_;
     std::vector<const PdfCluster *> word_; ///< a blank, or characters without one
-    QByteArray operators_;                 ///< of the page at hand, not yet written to it
+    QByteArray operators_;                 ///< of the current page, not yet written to it
     bool failed_ = false;
 };
 

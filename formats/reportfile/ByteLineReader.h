@@ -31,7 +31,7 @@ private:
     QByteArray bytes_;
     qsizetype at_ = 0;
     bool atEnd_ = false;
-    qsizetype taken_ = 0; ///< bytes of the file that the piece was made of, which stand before `at_`
+    qsizetype taken_ = 0; ///< bytes of the file that the piece was made of, which are before `at_`
     qsizetype size_ = 0;
 };
 

@@ -24,7 +24,7 @@ ReportTextWriter::~ReportTextWriter() = default;
 
 bool ReportTextWriter::writeBytes(const char *bytes, std::size_t size)
 {
-    if (!std::exchange(hasFailed_, true)) { // also where the device throws: nobody knows how much of it was taken
+    if (!std::exchange(hasFailed_, true)) { // also where the device throws: it is not known how much of it was taken
         hasFailed_ = device_.write(bytes, static_cast<qint64>(size)) != static_cast<qint64>(size);
     }
     return !hasFailed_;
@@ -35,7 +35,7 @@ bool ReportTextWriter::writePieces(Text text, bool last)
 {
     if (!hasBegun_) {
         hasBegun_ = true;
-        // What cannot be turned into bytes is as good as not written.
+        // What cannot be converted to bytes counts as not written.
         hasFailed_ = !doneWhileMemoryLasts([this] { bytes_.resize(ReportTextEncoder::bound(pieceSize)); });
         if (lineEnds_ == LineEnds::ReportFile) {
             writeBytes(reportFileMark, sizeof reportFileMark);

@@ -20,7 +20,7 @@ class RichTextTarget
 public:
     virtual ~RichTextTarget() = default;
 
-    /// Whether it wants to know the formats. Otherwise any number does for one.
+    /// Whether it needs the formats. Otherwise any number does for one.
     virtual bool takesFormats() const = 0;
     /// Adds text to the paragraph; it holds no characters that part paragraphs.
     virtual void append(QLatin1StringView text, int format) = 0;
@@ -31,7 +31,7 @@ public:
     virtual void endParagraph(const RichTextParagraph &paragraph, int format) = 0;
 };
 
-/// Collects the characters alone, paragraphs parted by U+2029.
+/// Collects the characters alone, paragraphs separated by U+2029.
 class RichTextCollector final : public RichTextTarget
 {
 public:
@@ -48,7 +48,7 @@ public:
         }
         isFirst_ = false;
         text_.append(paragraph_);
-        paragraph_.resize(0); // not clear(), which would give the room back
+        paragraph_.resize(0); // not clear(), which would release the memory
     }
 
 private:
@@ -57,8 +57,8 @@ private:
     bool isFirst_ = true;
 };
 
-/// Fills a document; all is there when the builder goes. Texts and paragraphs of the same formats are inserted together, as
-/// each insertion has its cost.
+/// Fills a document; all is there when the builder is destroyed. Texts and paragraphs of the same formats are inserted
+/// together, as each insertion takes time of its own.
 class RichTextBuilder final : public RichTextTarget
 {
 public:

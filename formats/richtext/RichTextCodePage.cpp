@@ -14,7 +14,7 @@ namespace
 constexpr int westernCodePage = 1252;
 
 /// Bytes 0x80 to 0x9F of code page 1252; the others are Latin-1. It is what nearly every file holds, and it is read alike
-/// where no converters are at hand.
+/// where there are no converters.
 constexpr std::array<char16_t, 32> western = {0x20AC, 0x0081, 0x201A, 0x0192, 0x201E, 0x2026, 0x2020, 0x2021,
                                               0x02C6, 0x2030, 0x0160, 0x2039, 0x0152, 0x008D, 0x017D, 0x008F,
                                               0x0090, 0x2018, 0x2019, 0x201C, 0x201D, 0x2022, 0x2013, 0x2014,
@@ -114,7 +114,7 @@ QString RichTextCodePage::decode(QByteArrayView bytes)
 
 RichTextCodePage &RichTextCodePages::page(int number)
 {
-    // Numbers that nobody knows share one page, however many a file makes up.
+    // Unknown numbers share one page, however many a file makes up.
     const bool known =
         number == symbolCodePage || std::any_of(std::begin(pageNames), std::end(pageNames),
                                                 [number](const NumberRow &row) { return row.number == number; });

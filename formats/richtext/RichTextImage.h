@@ -10,7 +10,7 @@ namespace kareport
 
 /// The rich text of a report, made piece by piece while the report is written.
 ///
-/// Every piece of text stands in a paragraph template of its style; every line end is a paragraph mark. Text goes in as it
+/// Every piece of text is put into the paragraph template of its style; every line end is a paragraph mark. Text goes in as it
 /// is: backslashes and braces act as markup.
 class RichTextImage
 {
@@ -46,7 +46,7 @@ public:
 private:
     struct ParagraphTemplate
     {
-        QString before; ///< what stands before the text
+        QString before; ///< what comes before the text
         QString behind;
     };
 

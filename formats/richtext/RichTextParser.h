@@ -21,7 +21,7 @@ class QTextDocument;
 namespace kareport
 {
 
-/// How bytes from 0x80 on are read that stand in a rich text as they are.
+/// How bytes from 0x80 on are read that are in a rich text without an escape.
 enum class RichTextRawBytes
 {
     CodePage,
@@ -104,7 +104,7 @@ private:
     bool isStarred_ = false;           ///< the next word is one of those that not every reader knows
     int fallback_ = 0;                 ///< characters to leave out, which stand for one in Unicode
     QByteArray bytes_;                 ///< of characters that may have several bytes
-    bool cellEnded_ = false;           ///< a tab stands here if more follows in the row
+    bool cellEnded_ = false;           ///< a tab comes here if more follows in the row
     bool nestedRowEnded_ = false;
     bool hiddenCounted_ = false; ///< the hidden text that is being passed over
     bool pageBreak_ = false;     ///< before the next paragraph

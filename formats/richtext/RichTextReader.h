@@ -46,7 +46,7 @@ bool isRichText(QLatin1StringView text);
 QByteArrayView richTextIn(QByteArrayView bytes);
 
 /// Reads the bytes of a rich-text file (RTF) into a document, whose content is replaced. Bytes from 0x80 on are read in the
-/// code page of the current font, else of the file. What stands after the end of the outermost group is not read.
+/// code page of the current font, else of the file. What is after the end of the outermost group is not read.
 /// Headers, footers, notes, pictures, objects and hidden text are passed over and counted in `notes`.
 /// The signs of the fonts Symbol and Wingdings become the characters that Unicode has for them.
 /// The document keeps no undo steps of what is read.

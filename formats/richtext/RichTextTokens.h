@@ -14,7 +14,7 @@ enum class RichTextTokenKind
     Word,        ///< a backslash and letters, with a number or without
     Symbol,      ///< a backslash and another character; an escaped line end is '\n'
     Byte,        ///< a backslash, an apostrophe and two hexadecimal digits
-    Text,        ///< bytes as they stand
+    Text,        ///< bytes as they are
     MissingData, ///< binary data that would reach beyond the end
     End
 };

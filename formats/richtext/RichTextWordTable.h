@@ -19,7 +19,7 @@ enum class RichTextAction
     PageBreak,
     SectionBreak,
     SamePage,
-    Style, ///< nothing: the words of its formats stand after it
+    Style, ///< nothing: the words of its formats are after it
     // Characters
     Plain,
     Font,

@@ -40,7 +40,7 @@ enum class MessageIcon
     Question
 };
 
-/// A message with all that can be said about its box.
+/// A message with all settings of its box.
 struct Message
 {
     QString text;                                ///< what the message says

@@ -26,7 +26,7 @@ enum class PaperSize
     Legal
 };
 
-/// The printer that the application prints on unless told otherwise.
+/// The printer that the application prints on unless another is given.
 struct DefaultPrinter
 {
     PrinterSource source = PrinterSource::SystemOrBuiltIn; ///< which printer it is

@@ -20,8 +20,8 @@ struct EditorLaunch
     UDocument *document = nullptr; ///< whose text the file holds; may be null
 };
 
-/// Starts a program with a file and lets it go on by itself, also beyond the end of this process. No shell reads the
-/// paths. Nobody is told when the program cannot be started.
+/// Starts a program with a file and lets it run on by itself, also beyond the end of this process. No shell reads the
+/// paths. A program that cannot be started is not reported.
 /// @param program, file  where they are relative, they are taken from the folder that this process works in
 /// @param document  whose text the file holds; may be null
 KAREPORT_EXPORT void launchEditor(const QString &program, const QString &file, const QString &folder,

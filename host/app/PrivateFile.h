@@ -17,7 +17,7 @@ bool openPrivateFile(QFile &file);
 /// @return false when something of that name cannot be removed, or no file can be made
 bool makePrivateFile(const QString &path);
 
-/// Whether there is anything of that name, be it a link that leads nowhere.
+/// Whether there is anything of that name, including a link that leads nowhere.
 bool isNameTaken(const QString &path);
 
 } // namespace kareport

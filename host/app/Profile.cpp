@@ -27,7 +27,7 @@ public:
 
     QString read(const QString &section, const QString &entry, const QString &fallback) const override
     {
-        // A text with commas that somebody wrote into the file by hand is read as a list.
+        // A text with commas that was written into the file by hand is read as a list.
         const QVariant value = settings_->value(keyOf(section, entry), fallback);
         return value.typeId() == QMetaType::QStringList ? value.toStringList().join(QStringLiteral(", "))
                                                         : value.toString();

@@ -32,7 +32,7 @@ KAREPORT_EXPORT std::unique_ptr<ProfileStore> makeSettingsProfile(const QString 
 /// Entries that are forgotten with the process: for programs whose output must not depend on a user's preferences.
 KAREPORT_EXPORT std::unique_ptr<ProfileStore> makeMemoryProfile();
 
-/// The store that the functions above work on; null goes back to the platform's settings store.
+/// The store that the functions above work on; null restores the platform's settings store.
 KAREPORT_EXPORT void setProfileStore(std::unique_ptr<ProfileStore> store);
 /// The same. @return the store before, which may be null
 KAREPORT_EXPORT std::unique_ptr<ProfileStore> exchangeProfileStore(std::unique_ptr<ProfileStore> store);

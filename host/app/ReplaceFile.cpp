@@ -23,7 +23,7 @@ bool finish(bool done, QString *error, const QString &reason)
     return done;
 }
 
-/// Why a file was not written. Where the disk takes a part of a piece, that is no error to the file yet.
+/// Why a file was not written. If the disk takes a part of a piece, the file does not report an error yet.
 QString reasonOf(const QFileDevice &file)
 {
     const bool isSaid = file.error() != QFileDevice::NoError && file.errorString() != QFile().errorString();
@@ -51,13 +51,13 @@ bool replaceFile(const QString &path, const std::function<bool(QIODevice &)> &wr
         return finish(false, error, file.errorString());
     }
     const UnfinishedFile unfinished(file.handle());
-    // Without the flush a commit overlooks that the last bytes did not fit.
+    // Without the flush a commit does not notice that the last bytes did not fit.
     if (!write(file) || !file.flush()) {
         QString reason = reasonOf(file);
         reason = reason.isEmpty() ? whyWritingFails(file.handle()) : reason;
         return finish(false, error, reason.isEmpty() ? Xlate("not all of it could be written") : reason);
     }
-    // A commit passes over what the disk has refused only now, as disks of other machines do.
+    // A commit ignores an error that the disk reports only now, as network disks do.
     const QString reason = whySyncFails(file.handle());
     if (!reason.isEmpty()) {
         return finish(false, error, reason);

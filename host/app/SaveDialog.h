@@ -22,7 +22,7 @@ struct SaveRequest
     QString defaultExtension; ///< for a name without one, without its dot
     QString fileName;         ///< that the dialog begins with
     QString initialFolder;    ///< empty for the host's own choice
-    /// Pairs of a kind's title and its name pattern, each behind a "|", ended by "||".
+    /// Pairs of a kind's title and its name pattern, each after a "|", ended by "||".
     QString filter;
     unsigned flags = 0;            ///< of those above
     UDocument *document = nullptr; ///< that is to be saved; may be null

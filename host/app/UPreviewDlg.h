@@ -6,8 +6,8 @@
 class KAREPORT_EXPORT UPreviewDlg
 {
 public:
-    /// Whether paper stands upright, as it does at first.
+    /// Whether paper is upright, as it does at first.
     static bool IsModulePrinterOrientationPortrait();
-    /// Sets whether paper stands upright.
+    /// Sets whether paper is upright.
     static void SetModulePrinterOrientationPortrait(bool portrait);
 };

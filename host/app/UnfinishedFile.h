@@ -3,7 +3,7 @@
 namespace kareport
 {
 
-/// Remembers the name of a file that stands beside its target while it is written, so that a program that is ended by a
+/// Remembers the name of a file that is written next to its target, so that a program that is ended by a
 /// signal can take it away. A file without a name, as most file systems have, vanishes by itself.
 class UnfinishedFile
 {

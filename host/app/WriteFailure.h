@@ -9,7 +9,7 @@ namespace kareport
 /// written.
 QString whyWritingFails(int handle);
 
-/// Waits until what was written to a file is on its disk. @return why the disk has not taken it; empty when it has, or when
+/// Waits until what was written to a file is on its disk. @return why it could not be stored; empty when it was, or when
 /// the file system cannot say
 QString whySyncFails(int handle);
 

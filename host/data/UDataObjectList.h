@@ -17,7 +17,7 @@ public:
     UDataObjectList(const UDataObjectList &) = delete;
     UDataObjectList &operator=(const UDataObjectList &) = delete;
 
-    /// The object at an index from 0, or null behind the last one. The list keeps it; it is valid until the next call of
+    /// The object at an index from 0, or null after the last one. The list keeps it; it is valid until the next call of
     /// any function of the list.
     virtual UDataObject *GetAt(std::size_t index);
 

@@ -12,7 +12,7 @@ public:
     /// The entry of an identifier, or null. The pointer is valid until the dictionary is changed.
     const UDictEntry *Find(unsigned id) const;
 
-    /// Stores a value under an identifier, in the place of an earlier one.
+    /// Stores a value under an identifier, replacing an earlier one.
     void Set(unsigned id, UDictEntry::Value value);
     /// The value under an identifier for refilling in place; a new entry holds an empty `T`.
     template <typename T>

@@ -6,7 +6,7 @@
 namespace kareport
 {
 
-/// Keeps a document when its last view goes. It must live as long as the guard.
+/// Keeps a document when its last view is destroyed. It must live as long as the guard.
 inline auto withoutAutoDelete(UDocument &document)
 {
     return ValueGuard(document.IsAutoDelete(), false, [&document](bool on) { document.SetAutoDelete(on); });

@@ -134,7 +134,7 @@ void COneViewPane::OnSysCommand(unsigned command, long /*parameter*/)
     }
     UDocument *document = GetActiveDocument();
     if (document != nullptr && document->GetViews().size() > 1 && !document->IsShown(this)) {
-        document->OnCloseDocument(); // its other panes are hidden: nobody could ever close it
+        document->OnCloseDocument(); // its other panes are hidden: it could never be closed
     } else {
         ClosePane();
     }

@@ -32,7 +32,7 @@ public:
     /// Docks the pane in the main frame, or lets it stand alone where there is none.
     void SetPlace(CViewPane *parent, unsigned style, const QRect *rect) override;
     void UpdateTitle() override;
-    /// Whether the pane is open, be it as a tab that another stands before.
+    /// Whether the pane is open, be it as a tab that another is before.
     bool IsVisible() const override;
     bool IsInFront() const override;
     /// Shows the pane and brings it to the front, or hides it.
@@ -43,20 +43,20 @@ public:
     /// A system command of the pane. Closing asks `CanClosePane`; other commands do nothing here.
     virtual void OnSysCommand(unsigned command, long parameter);
 
-    /// Whether the pane may stand among the documents as one of their tabs.
+    /// Whether the pane may be one of the tabs of the documents.
     virtual bool CanBeTabbedDocument() const { return true; }
     /// Marks the caption or takes the mark away.
     void SetCaptionState(CaptionState state);
     /// What `SetCaptionState` was given last; plain without a dock widget.
     CaptionState GetCaptionState() const;
 
-    /// The pane's dock widget; null once it has gone with the frame that it stood in.
+    /// The pane's dock widget; null once it has been destroyed with its frame.
     QDockWidget *GetDock() const;
 
 protected:
-    /// Makes the dock widget again where there is none any more.
+    /// Makes the dock widget again if it no longer exists.
     void MakeDock();
-    /// Takes the dock widget away, with all that stands in it.
+    /// Takes the dock widget away, with all that is in it.
     void DropDock();
 
 private:

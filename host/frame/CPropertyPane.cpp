@@ -28,7 +28,7 @@ void CPropertyPane::OnUpdateProperties(UDocument * /*document*/) {}
 
 void CPropertyPane::UpdateAllPropertyPane(UDocument *document)
 {
-    // A pane may close itself or another one while it is told.
+    // A pane may close itself or another one while it is notified.
     const std::vector<CPropertyPane *> panes = propertyPanes();
     for (CPropertyPane *pane : panes) {
         if (std::find(propertyPanes().begin(), propertyPanes().end(), pane) != propertyPanes().end()) {

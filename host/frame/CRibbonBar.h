@@ -10,7 +10,7 @@ class UView;
 class CRibbonBar
 {
 public:
-    /// Remembers the tab of a view, in the place of an earlier one. @param index  from 0
+    /// Remembers the tab of a view, replacing an earlier one. @param index  from 0
     void SetRibbonTabIndexForView(const UView *view, int index) { tabs_.insert(view, index); }
     /// Forgets the tab of a view; nothing for a view that has none.
     void RemoveRibbonTabIndexForView(const UView *view) { tabs_.remove(view); }

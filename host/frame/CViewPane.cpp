@@ -24,7 +24,7 @@ CViewPane::CViewPane()
 CViewPane::~CViewPane()
 {
     std::erase(openPanes(), this);
-    views_.clear(); // while the pane is still whole: its views ask for it when they go
+    views_.clear(); // while the pane is still complete: its views ask for it when they are destroyed
 }
 
 bool CViewPane::IsOpen(const CViewPane *pane)
@@ -104,7 +104,8 @@ bool CViewPane::CanClosePane()
 
 void CViewPane::ClosePane()
 {
-    // The pane is no longer open while its views go: a document that closes with its last view must not close it again.
+    // The pane is no longer open while its views are destroyed: a document that closes with its last view must not
+    // close it again.
     if (std::erase(openPanes(), this) == 0) {
         return;
     }

@@ -33,7 +33,7 @@ public:
     const std::vector<std::unique_ptr<UView>> &GetViews() const { return views_; }
     /// Takes a view out of the pane and destroys it.
     void RemoveView(UView *view);
-    /// Where the pane is to stand: window style and rectangle (null for the usual one). Called once, before it is shown.
+    /// Where the pane is placed: window style and rectangle (null for the usual one). Called once, before it is shown.
     virtual void SetPlace(CViewPane *parent, unsigned style, const QRect *rect);
     /// The window style that `SetPlace` was given; 0 before.
     unsigned GetStyle() const { return style_; }
@@ -43,17 +43,17 @@ public:
     UView *GetActiveView() const { return views_.empty() ? nullptr : views_.back().get(); }
     /// The document of that view; null for a pane without one.
     UDocument *GetActiveDocument() const;
-    /// What the pane shows: the document of its view, or for a pane without one what stands in its body; null for nothing.
+    /// What the pane shows: the document of its view, or for a pane without one what its body shows; null for nothing.
     virtual UDocument *GetShownDocument() const { return GetActiveDocument(); }
     /// Handles the frame's commands while the pane has the keyboard, before the active view does: a command that it knows
-    /// goes no further. Null leaves them all to the view.
+    /// is not passed on. Null leaves them all to the view.
     virtual kareport::CommandTarget *GetCommandTarget() { return nullptr; }
 
     /// The pane's title without its number.
     virtual void SetWindowTextW(const QString &text);
     /// The title as it was set, without a number.
     const QString &GetWindowTextW() const { return text_; }
-    /// What stands on the pane's caption: its title, with ":" and its number when it has one.
+    /// The text of the pane's caption: its title, with ":" and its number when it has one.
     QString GetCaption() const;
     /// Shows title and number again after one of them changed.
     virtual void UpdateTitle();
@@ -66,7 +66,7 @@ public:
 
     /// Whether the pane is open: shown, and not hidden since.
     virtual bool IsVisible() const { return visible_; }
-    /// Whether the user sees the pane: it is visible, and no tab of another stands before it.
+    /// Whether the user sees the pane: it is visible, and no tab of another pane covers it.
     virtual bool IsInFront() const { return IsVisible(); }
     /// Shows the pane, or hides it with all that is in it.
     virtual void ShowPane(bool show);
@@ -75,7 +75,7 @@ public:
 
     /// Whether the pane may be closed; asks its document.
     virtual bool CanClosePane();
-    /// Closes the pane without asking: its views go, and the pane itself with them.
+    /// Closes the pane without asking: its views are destroyed, and the pane itself with them.
     virtual void ClosePane();
 
     /// Whether the caption is the title of a document. That of a pane with a body of its own is not.

@@ -29,7 +29,7 @@ class KAREPORT_EXPORT CommandTarget
 public:
     virtual ~CommandTarget();
 
-    /// The commands, in order; a handler and an update handler of one id may stand in different rows.
+    /// The commands, in order; a handler and an update handler of one id may be in different rows.
     virtual const std::vector<Command> &commands() const = 0;
 
     /// Runs a command. @return false when this class has no handler for it

@@ -21,7 +21,7 @@ namespace
 
 QMainWindow *frameOf(const QWidget &dock)
 {
-    // Floating docks that were dropped on each other stand in a window between.
+    // Floating docks that were dropped on each other share a window of their own.
     for (QWidget *parent = dock.parentWidget(); parent != nullptr; parent = parent->parentWidget()) {
         if (auto *frame = qobject_cast<QMainWindow *>(parent)) {
             return frame;
@@ -40,7 +40,7 @@ PaneDock::PaneDock(COneViewPane *pane) : pane_(pane)
     connect(this, &QDockWidget::topLevelChanged, this, &PaneDock::showCaption);
     // The frame is still in the middle of placing it.
     connect(this, &QDockWidget::dockLocationChanged, this, &PaneDock::standAlone, Qt::QueuedConnection);
-    // Whoever brings a pane back from the frame's list of panes wants to see it, also where it is one of several tabs.
+    // A user who brings a pane back from the frame's list of panes wants to see it, even if it is one of several tabs.
     connect(toggleViewAction(), &QAction::triggered, this, [this](bool shown) {
         if (shown && pane_ != nullptr) {
             pane_->BringToTop();
@@ -101,7 +101,7 @@ void PaneDock::standAlone()
 
 bool PaneDock::isBehindTab() const
 {
-    // The frame moves what stands behind a tab out of its sight and leaves it visible.
+    // The frame moves what is behind a tab out of its area and leaves it visible.
     return !isWindow() && (geometry().right() < 0 || geometry().bottom() < 0);
 }
 
@@ -146,7 +146,7 @@ void PaneDock::noteFront()
         return;
     }
     wasInFront_ = isInFront;
-    // A window in which panes float as tabs does not tell the frame when it places them anew.
+    // A window in which panes float as tabs does not tell the frame when it places them again.
     if (UXTPMDIFrameWnd *frame = UXTPMDIFrameWnd::Get(); frame != nullptr && pane_ != nullptr) {
         frame->SettleLater();
     }
@@ -188,7 +188,7 @@ void PaneDock::paintEvent(QPaintEvent *event)
     QDockWidget::paintEvent(event);
     QStyleOptionDockWidget option;
     initStyleOption(&option);
-    // Where the window system draws the caption, the content stands in its place.
+    // Where the window system draws the caption, the content takes its place.
     if (!marked_ || (widget() != nullptr && option.rect.intersects(widget()->geometry()))) {
         return;
     }

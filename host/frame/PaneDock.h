@@ -14,7 +14,7 @@ class PaneDock : public QDockWidget
 public:
     explicit PaneDock(COneViewPane *pane);
 
-    /// The pane; null once that has gone.
+    /// The pane; null once it has been destroyed.
     COneViewPane *pane() const { return pane_; }
     void leavePane() { pane_ = nullptr; }
 
@@ -23,11 +23,11 @@ public:
     void setMarked(bool marked);
     bool isMarked() const { return marked_; }
 
-    /// Whether the dock widget is in a row of tabs that the pane does not stand in.
+    /// Whether the dock widget is in a row of tabs that the pane is not in.
     bool isTabbedAgainstItsWill() const;
     /// Leaves such a row for a place of its own in the same area.
     void standAlone();
-    /// Whether the tab of another dock widget stands before it.
+    /// Whether the tab of another dock widget covers it.
     bool isBehindTab() const;
     /// Comes before the other tabs of its row and, where it floats, before other windows.
     void comeToFront();
@@ -42,7 +42,7 @@ protected:
 private:
     void showCaption();
     void activatePane();
-    /// Lets the frame choose the active pane anew when the pane came to the front or went from it.
+    /// Lets the frame choose the active pane again when the pane came to the front or left it.
     void noteFront();
 
     COneViewPane *pane_;

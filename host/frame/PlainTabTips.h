@@ -7,7 +7,7 @@ class QMainWindow;
 namespace kareport
 {
 
-/// Shows the titles of docked windows to the letter in the tool tips of their tabs, which Qt makes of the titles and would
+/// Shows the titles of docked windows literally in the tool tips of their tabs, which Qt makes of the titles and would
 /// show as HTML.
 class PlainTabTips : public QObject
 {

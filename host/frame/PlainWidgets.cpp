@@ -42,7 +42,7 @@ MessageAnswer showMessageBox(QWidget *parent, const Message &message)
     box.setIcon(boxIcon(message));
     box.setStandardButtons(boxButtons(message.buttons));
     if (message.buttons == MessageButtons::YesNo) {
-        // The Escape key is no answer, least of all one that throws something away.
+        // The Escape key is not an answer, least of all one that discards something.
         QPushButton *none = box.addButton(QMessageBox::Cancel);
         none->hide();
         box.setEscapeButton(none);
@@ -72,7 +72,7 @@ void keepLabelsPlain(const QWidget &window)
 
 QString plainToolTip(const QString &text)
 {
-    // What does not look like HTML is shown as it is, and one line of it is not broken.
+    // A text that does not look like HTML is shown unchanged, and a single line is not broken.
     return Qt::mightBeRichText(text) ? QStringLiteral("<qt>%1</qt>").arg(text.toHtmlEscaped()) : text;
 }
 

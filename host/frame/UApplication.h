@@ -49,9 +49,9 @@ public:
     void SetCurrentReport(UDocument *report) { currentReport_ = report; }
     /// Notes the view that goes with the current report; null for none.
     void SetCompanionView(UView *view) { companionView_ = view; }
-    /// Takes a document that goes out of the pair; nothing when it is another one.
+    /// Takes a document that is being destroyed, out of the pair; nothing when it is another one.
     void ForgetReport(const UDocument *report);
-    /// Takes a view that goes out of the pair; nothing when it is another one.
+    /// Takes a view that is being destroyed, out of the pair; nothing when it is another one.
     void ForgetView(const UView *view);
 
 private:

@@ -33,7 +33,7 @@ public:
     void Write(QByteArrayView bytes);
     /// Whether nothing has failed so far.
     bool IsGood() const { return good_; }
-    /// Gives the storing or loading up: `IsGood` answers false from then on.
+    /// Abandons storing or loading: `IsGood` answers false from then on.
     void Abandon() { good_ = false; }
 
 private:

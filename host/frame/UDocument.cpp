@@ -90,12 +90,12 @@ void UDocument::UpdateFrameCounts()
         if (visiblePane(view) != nullptr) {
             pane->SetWindowNumber(-1);
         } else if (pane != nullptr && pane->GetWindowNumber() != 0) {
-            // Nobody sees it: it does not keep the document when the others are closed.
+            // It is not visible: it does not keep the document when the others are closed.
             pane->SetWindowNumber(0);
             pane->UpdateTitle();
         }
     }
-    // Nothing is collected: views count again when they go, where nothing may fail.
+    // Nothing is collected: views count again when they are destroyed, where nothing may fail.
     CViewPane *first = nullptr;
     int count = 0;
     for (const UView *view : views_) {
@@ -225,7 +225,7 @@ void UDocument::CloseAllPanes()
         if (CViewPane *pane = view->GetParentPane()) {
             pane->ClosePane();
         }
-        // A view without a pane, or of a pane that only closes later, goes by itself.
+        // A view without a pane, or of a pane that only closes later, is destroyed by itself.
         if (!views_.empty() && views_.front() == view) {
             RemoveView(view);
         }

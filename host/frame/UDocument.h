@@ -51,7 +51,7 @@ public:
     const std::vector<UView *> &GetViews() const { return views_; }
     /// Adds a view, which shows this document from then on. The view stays its pane's.
     void AddView(UView *view);
-    /// Called by a view that goes. A document whose last view has gone closes, unless auto-delete is off.
+    /// Called by a view that is destroyed. A document closes with its last view, unless auto-delete is off.
     void RemoveView(UView *view);
     /// Tells every view but the sender that the document has changed.
     virtual void UpdateAllViews(UView *sender, long hint = 0, void *hintObject = nullptr);
@@ -73,7 +73,8 @@ public:
     bool DoFileSave();
 
     /// Asks the user whether to save a modified document. @return false when the closing was cancelled, and when the
-    /// document was closed while the question was open. What is told of a save may close it as well
+    /// document was closed while the question was open. A view or a document that is notified of a save may close it
+    /// as well
     virtual bool SaveModified();
     /// Whether a pane that shows the document may be closed.
     virtual bool CanCloseFrame(CViewPane *pane);
@@ -87,7 +88,7 @@ public:
     virtual void OnAutoDelete();
     /// Called after the document has been made, opened, saved or closed: tells the application.
     virtual void OnDocumentEvent(DocumentEvent event);
-    /// Whether the document only serves a search of the shell's; no document of this host does.
+    /// Whether the document was only opened for a search by the shell; never so in this host.
     virtual bool IsSearchAndOrganizeHandler() const { return false; }
 
     /// Whether the document deletes itself when it is closed, as it does at first.
@@ -95,7 +96,7 @@ public:
     /// Sets whether the document deletes itself when it is closed. Where it does not, whoever says so deletes it.
     void SetAutoDelete(bool on) { autoDelete_ = on; }
 
-    /// Tells the document that a report it had asked for has been closed and is about to go.
+    /// Tells the document that a report it had asked for has been closed and is about to be deleted.
     virtual void OnReportClosed(UDocument *report);
     /// Takes the text that the user has written for one of the document's objects.
     /// @return false when the document has no such object (any more)

@@ -28,12 +28,12 @@ public:
     /// The pane that shows the view; null for a view without one.
     CViewPane *GetParentPane() const { return pane_; }
 
-    /// A place that holds the view, and null once it has gone: for those who remember a view that may go meanwhile.
+    /// A place that holds the view, and null once it has been destroyed: for code that remembers a view.
     std::shared_ptr<UView *const> GetHandle() const { return handle_; }
 
     /// The input operation that the view is in the middle of, not owned; null for none.
     XInput *Top() const { return top_; }
-    /// Whoever begins an operation sets it, and takes it away when it ends.
+    /// The code that begins an operation sets it, and removes it when the operation ends.
     void SetTop(XInput *input) { top_ = input; }
 
     /// The window that shows the view, owned by it; null for a view without one.

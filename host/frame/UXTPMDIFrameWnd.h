@@ -25,9 +25,9 @@ class UView;
 /// to itself. There is at most one at a time.
 ///
 /// Of the panes that dock in it one is the active one. It has the keyboard, and its view is the active view. A pane that
-/// comes to the front, in whatever way, becomes the active one at once; when it goes, the one that was used last before it
-/// and can be seen follows. A pane without a view, as a report window is, leaves the active view as it is, but commands that
-/// it knows stay with it. No command reaches a view whose pane cannot be seen.
+/// comes to the front, for whatever reason, becomes the active one at once; when it is closed, the one that was used
+/// last before it and can be seen follows. A pane without a view, as a report window is, leaves the active view as it
+/// is, but commands that it knows stay with it. No command reaches a view whose pane cannot be seen.
 class KAREPORT_EXPORT UXTPMDIFrameWnd : public QMainWindow, public kareport::CommandTarget
 {
 public:
@@ -56,14 +56,14 @@ public:
 
     /// The action of a command, made with its first use: menus and bars that show a command show one action.
     QAction *CommandAction(unsigned id);
-    /// Adds a command to a menu under a text such as "&Save\tCtrl+S": what stands behind the tab is its key.
+    /// Adds a command to a menu under a text such as "&Save\tCtrl+S": what follows the tab is its key.
     QAction *AddCommand(QMenu &menu, unsigned id, const QString &text);
-    /// Runs a command wherever it is handled. @return false when nobody handles it
+    /// Runs a command wherever it is handled. @return false when nothing handles it
     bool OnCommand(unsigned id);
     /// Brings the state of all actions up to date.
     void UpdateCommands();
 
-    /// Docks a pane among the others: beside them as a tab, unless it has a place of its own.
+    /// Docks a pane among the others: next to them as a tab, unless it has a place of its own.
     virtual void DockPane(COneViewPane &pane);
 
     const std::vector<kareport::Command> &commands() const override;

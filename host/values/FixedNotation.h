@@ -27,7 +27,7 @@ private:
     bool writeByScaling(double magnitude, int decimals);
     void writeExactly(double magnitude, int decimals);
 
-    std::array<char, 40> short_; ///< the digits stand at its end
+    std::array<char, 40> short_; ///< the digits are at its end
     std::size_t size_ = 0;
     std::string long_; ///< used for what does not fit into `short_`
     bool zero_ = false;

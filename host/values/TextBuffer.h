@@ -13,7 +13,7 @@ namespace kareport
 /// A growing buffer of UTF-16 characters that is reused from row to row, so that a value is formatted without an
 /// allocation of its own.
 ///
-/// All of it stands in this header: a host library of its own, and the module, each have it without asking the other for it.
+/// All of it is in this header: a host library of its own, and the module, each have it without asking the other for it.
 class TextBuffer
 {
 public:
@@ -54,10 +54,10 @@ public:
     void appendFill(std::size_t count, char16_t character) { std::fill_n(extend(count), count, character); }
     /// Inserts `count` times a character at a position (at most `size()`).
     void insertFill(std::size_t position, std::size_t count, char16_t character);
-    /// Puts blanks before (`width` above 0) or after (below 0) what stands from `start` on, until that part is at
+    /// Puts blanks before (`width` above 0) or after (below 0) the text from `start` on, until that part is at
     /// least |width| characters long: what C's printf does with "%*s".
     void pad(std::size_t start, int width);
-    /// Takes white space off both ends of what stands from `start` on.
+    /// Takes white space off both ends of the text from `start` on.
     void trim(std::size_t start);
 
 private:

@@ -15,13 +15,13 @@ class TextPlaces
 public:
     explicit TextPlaces(QStringView text);
 
-    /// The place of the character at a position; behind the end, the place of the end.
+    /// The place of the character at a position; after the end, the place of the end.
     TextPlace of(qsizetype position) const;
 
 private:
     QStringView text_;
     std::vector<qsizetype> lineStarts_;
-    std::vector<qsizetype> pairs_; ///< where the second halves of surrogate pairs stand
+    std::vector<qsizetype> pairs_; ///< where the second halves of surrogate pairs are
 };
 
 } // namespace kareport

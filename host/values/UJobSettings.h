@@ -14,11 +14,11 @@ namespace kareport
 /// How a length becomes a text.
 struct LengthForm
 {
-    bool fromInternal =
-        false;             ///< the value is in metres and is converted first; otherwise it is in the shown unit already
-    bool withUnit = false; ///< a blank and the unit's symbol follow
-    int decimals = -1;     ///< -1 takes `UJobSettings::lengthDecimals`
-    int width = -1;        ///< blanks are put before a shorter text; -1 for none
+    /// The value is in metres and is converted first; otherwise it is in the shown unit already.
+    bool fromInternal = false;
+    bool withUnit = false;  ///< a blank and the unit's symbol follow
+    int decimals = -1;      ///< -1 takes `UJobSettings::lengthDecimals`
+    int width = -1;         ///< blanks are put before a shorter text; -1 for none
     bool blankZero = false; ///< a text whose digits are all 0 becomes ""
 };
 
@@ -31,8 +31,8 @@ struct StationForm
     int decimals = -1;         ///< -1 takes `UJobSettings::stationDecimals`
     int width = -1;            ///< the text is filled with blanks to this width
     bool blankZero = false;    ///< a text without a digit other than 0 becomes ""
-    bool alignRight = false;   ///< blanks go before the text, otherwise after it
-    bool trimZeros = false;    ///< trailing zeros of the fraction go, and the point with the last of them
+    bool alignRight = false;   ///< blanks are put before the text, otherwise after it
+    bool trimZeros = false;    ///< trailing zeros of the fraction are dropped, and the point with the last of them
     bool showSign = false;     ///< a value below zero gets "-" in front, unless only zeros are shown
 };
 
@@ -71,9 +71,9 @@ public:
     /// Degree, minute and second mark, Latin-1; the character 0 shows no mark.
     std::array<char, 3> angleMarks = {'\xB0', '\'', '"'};
 
-    /// Turns a value from its internal unit (metre, square metre, radian) into the unit it is shown in.
-    /// @param unitKind  the value type code (`VARIABLE_TYPE`): a value of a length, of an area or of an angle is turned, any other is
-    ///                  returned as it is
+    /// Converts a value from its internal unit (metre, square metre, radian) to the unit it is shown in.
+    /// @param unitKind  the value type code (`VARIABLE_TYPE`): a length, an area or an angle is converted, any other value
+    ///                  is returned as it is
     /// @param reserved  0
     double ConvertToDisplay(double value, int unitKind, int reserved) const;
 

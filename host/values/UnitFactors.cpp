@@ -52,7 +52,7 @@ constexpr std::array<AngleRow, 3> angles = {{
     {AngleUnit::Radian, u"rad", 1.0},
 }};
 
-/// Whether each row stands at the place of its unit, where it is looked up.
+/// Whether each row is at the place of its unit, where it is looked up.
 template <typename Rows>
 constexpr bool standInOrder(const Rows &rows)
 {

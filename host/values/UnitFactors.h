@@ -15,7 +15,7 @@ double metresIn(LengthUnit unit);
 double squareMetresIn(AreaUnit unit);
 /// How many of the unit one radian is.
 double perRadian(AngleUnit unit);
-/// The symbol that is shown behind a length; both feet show "ft".
+/// The symbol that is shown after a length; both feet show "ft".
 QStringView symbolOf(LengthUnit unit);
 
 /// The unit of a settings key such as "usft", "ha" or "gon"; nothing for any other text. Case matters.

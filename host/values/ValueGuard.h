@@ -7,7 +7,7 @@ namespace kareport
 ///
 ///     const ValueGuard guard(object.isOn(), false, [&object](bool on) { object.setOn(on); });
 ///
-/// Where the object may go meanwhile, the function that sets looks whether it is still there.
+/// If the object may be destroyed meanwhile, the function that sets checks that it still exists.
 template <typename Value, typename Set>
 class [[nodiscard]] ValueGuard
 {

@@ -10,7 +10,7 @@ namespace
 
 TEST(DeskPipe, IsNotWaitedFor)
 {
-    // Nobody writes into it: who opened it would wait for ever.
+    // Nothing writes into it: opening it would never return.
     const JobFolder folder;
     ASSERT_EQ(mkfifo(QFile::encodeName(folder.path("pipe.csv")).constData(), 0600), 0);
     ASSERT_EQ(mkfifo(QFile::encodeName(folder.path("pipe.json")).constData(), 0600), 0);

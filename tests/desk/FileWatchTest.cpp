@@ -9,8 +9,8 @@
 namespace
 {
 
-/// Waits until `count` changes have been told, and then until another file's change has been told as well: by then a
-/// further one would have been.
+/// Waits until `count` changes have been reported, and then until another file's change has been reported as well: by
+/// then a further one would have been.
 class Watched
 {
 public:
@@ -25,7 +25,7 @@ public:
     {
         return QTest::qWaitFor([&] { return told.size() >= count; });
     }
-    /// Changes the other file and waits for it to be told.
+    /// Changes the other file and waits for it to be reported.
     QStringList settled()
     {
         folder.put("other", QByteArray(++others_ + 1, 'x'));

@@ -2,7 +2,7 @@
 #include "DeskCommandIds.h"
 #include "DeskFixture.h"
 
-// Panes that float together: in a frame that drags rows of tabs as one, such a row stands in a window of its own.
+// Panes that float together: in a frame that drags rows of tabs as one, such a row is in a window of its own.
 
 namespace
 {

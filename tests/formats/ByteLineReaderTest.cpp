@@ -93,7 +93,7 @@ TEST(ByteLineReader, LongLinesComeInPieces)
     }
 }
 
-/// What the reader does, said with the whole text at hand.
+/// What the reader does, stated for the whole text at once.
 QStringList expectedPieces(QByteArray bytes)
 {
     const QString text = QString::fromLatin1(bytes.replace("\r\n", "\n"));
@@ -109,7 +109,7 @@ QStringList expectedPieces(QByteArray bytes)
 
 TEST(ByteLineReader, LinesAreWholeWhereverTheyStandInTheFile)
 {
-    // Bytes are taken from the device in chunks: line ends stand before, on and behind the places where one ends.
+    // Bytes are taken from the device in chunks: line ends are before, on and after the places where one ends.
     for (const int chunk : {256 * 1024, 2 * 256 * 1024}) {
         for (int before = chunk - 3; before <= chunk + 1; ++before) {
             QByteArray bytes;
@@ -137,7 +137,7 @@ TEST(ByteLineReader, ReadsAnyMixtureOfLineEnds)
     }
 }
 
-/// Gives a few bytes at a time, and fails behind the last of them when it is told to.
+/// Gives a few bytes at a time, and fails after the last of them when it is asked to.
 class SlowDevice : public QIODevice
 {
 public:

@@ -61,7 +61,7 @@ QString gridText()
     return text;
 }
 
-/// Where a line stands, in dots.
+/// Where a line is, in dots.
 QRect cellsAt(double lineHeight, std::size_t line, int first, int count)
 {
     const double top = margin + static_cast<double>(line) * lineHeight;

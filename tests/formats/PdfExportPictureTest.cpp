@@ -12,7 +12,7 @@
 
 #include <utility>
 
-// Pages as they are seen, compared with the same text drawn by somebody else's hand.
+// Pages as they are seen, compared with the same text drawn by other code.
 
 namespace
 {
@@ -137,7 +137,7 @@ TEST(PdfExportPicture, EveryLetterHasAllItsParts)
     QString letters;
     for (const auto &[first, last] : ranges) {
         for (char32_t letter = first; letter <= last; ++letter) {
-            // What has no room of its own stands on its neighbour.
+            // A mark without room of its own is drawn on its neighbour.
             const bool hasRoom = QChar::isPrint(letter) && !QChar::isSpace(letter) && !QChar::isMark(letter);
             if (hasRoom && face.covers(letter)) {
                 letters += QChar(static_cast<char16_t>(letter));

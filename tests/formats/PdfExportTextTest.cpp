@@ -6,7 +6,7 @@
 #include <string>
 #include <thread>
 
-// What stands in a PDF, read back as text.
+// The text of a PDF, read back.
 
 namespace
 {

@@ -26,7 +26,7 @@ QTextCharFormat plain()
     return format;
 }
 
-/// What is written of a text behind the tables.
+/// What is written of a text after the tables.
 QByteArray writtenText(const QString &text)
 {
     QTextDocument document;

@@ -96,7 +96,7 @@ TEST(VerticalProfile, ACircleTouchesBothGradesAndKeepsItsRadius)
 {
     for (const double side : {1.0, -1.0}) {
         for (const double radius : {50.0, 2500.0, 1e7}) {
-            // Grades of 3 to 4, whose tangents are easily told.
+            // Grades of 3 to 4, whose tangents are easily computed.
             const double reach = radius * 2;
             const VerticalProfile profile =
                 profileOf({{-reach, -side * reach * 0.75}, circle(0, 0, radius), {reach, -side * reach * 0.75}});

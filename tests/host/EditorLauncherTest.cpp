@@ -20,7 +20,7 @@ bool waitFor(Condition condition)
     return QTest::qWaitFor(condition, 10'000);
 }
 
-/// A program that notes beside itself with what it was started.
+/// A program that notes in its own folder how it was started.
 class StandIn
 {
 public:

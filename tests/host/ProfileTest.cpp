@@ -27,7 +27,7 @@ public:
     ProfileRestored &operator=(const ProfileRestored &) = delete;
 };
 
-/// Lets the platform's settings store of the application live in a folder that goes with the test.
+/// Lets the platform's settings store of the application live in a folder that is removed after the test.
 class RedirectedSettings
 {
 public:

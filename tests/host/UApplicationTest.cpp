@@ -87,7 +87,7 @@ TEST(UApplication, NoPaneOfItsDocumentsStaysOpenWhenItGoes)
     EXPECT_EQ(paneCaptions(), QStringList());
 }
 
-/// A document that asks for the application while it goes.
+/// A document that asks for the application while it is destroyed.
 class AskingDocument : public TextDocument
 {
 public:

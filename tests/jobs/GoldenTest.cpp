@@ -27,7 +27,7 @@ qsizetype firstDifference(const QByteArray &left, const QByteArray &right)
     return std::count(left.begin(), end, '\n') + 1;
 }
 
-/// The examples come out as they did when somebody last read them. scripts/update-goldens.sh makes them anew.
+/// The examples come out as they did when they were last read. scripts/update-goldens.sh makes them again.
 TEST(Golden, EveryExampleComesOutByteForByte)
 {
     const QDir examples(QStringLiteral(KAREPORT_EXAMPLES_DIR));

@@ -113,7 +113,7 @@ TEST(JobDataKinds, WhatIsWrongWithASourceHasItsPlace)
 {
     struct Row
     {
-        const char *set; ///< "@" stands before what is meant, when that is in the job
+        const char *set; ///< "@" is before what is meant, when that is in the job
         const char *file;
         const char *contains;
         const char *reason;
@@ -149,7 +149,7 @@ TEST(JobDataKinds, WhatIsWrongWithASourceHasItsPlace)
             << row.reason << ": " << message.toStdString();
         EXPECT_TRUE(message.contains(QLatin1StringView(row.contains))) << row.reason << ": " << message.toStdString();
         if (mark < set.size()) {
-            const QByteArray before = jobs::fixedFront + templateJob(front, {}); // all of it stands in one line
+            const QByteArray before = jobs::fixedFront + templateJob(front, {}); // all of it is in one line
             const qsizetype column = before.indexOf(front) + front.size() + mark + 1;
             ASSERT_TRUE(job.error->place) << row.reason;
             EXPECT_EQ(job.error->place->column, column) << row.reason << ": " << message.toStdString();

@@ -37,7 +37,7 @@ void putData(const TestJob &job)
     geo::runSql(job.folder.path("points.db"), "CREATE TABLE points (Number TEXT, Code TEXT, Northing REAL)");
 }
 
-/// The step that a job of `runStep` has stands here in its line.
+/// The step that a job of `runStep` has is here in its line.
 const char *const tableStep = R"({"table": "Points", "data": "p"})";
 
 TEST(JobNotes, SayWhatDoesNotComeTogether)

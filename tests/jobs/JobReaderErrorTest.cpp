@@ -10,7 +10,7 @@ namespace
 using kareport::errorOf;
 using kareport::JsonSource;
 
-/// A job with one mistake, which "@" stands before.
+/// A job with one mistake, which is marked by "@".
 struct Row
 {
     const char *job;

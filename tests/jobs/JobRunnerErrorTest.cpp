@@ -12,7 +12,7 @@ TEST(JobRunnerError, OfAStepHasItsPlaceInTheJob)
     struct Row
     {
         const char *data;
-        const char *steps; ///< "@" stands before the mistake, here or in the data
+        const char *steps; ///< "@" marks the mistake, here or in the data
         const char *contains;
         const char *reason;
     };

@@ -13,7 +13,7 @@ namespace
 
 const char *const shortForm = "render -t t.xml -n CONTROL --table Points --set header=false ";
 
-/// The rows of the table: without a header, no heading stands over them.
+/// The rows of the table: without a header, no heading is over them.
 QByteArray tableText()
 {
     return "1    |   12.500\n2A   |    0.000\n";

@@ -12,7 +12,7 @@ struct Row
 {
     const char *file;
     std::function<QByteArray(QByteArray good)> spoil; ///< none: the file is taken away
-    const char *place;                                ///< how the message begins, behind the folder
+    const char *place;                                ///< how the message begins, after the folder
     const char *contains;
     const char *reason;
 };

@@ -172,7 +172,7 @@ TEST(CommandLineLimit, WhatShowsOnlyWhileItIsMadeIsRefusedThen)
 
 TEST(CommandLineLimit, TheWorkEndsWhereTheLimitIsPassed)
 {
-    // A mistake far behind shows that no more is made.
+    // A mistake far down shows that no more is made.
     for (const char *outputs : {"-o out.txt", "-o out.txt -o out.rep", "-o out.pdf"}) {
         const CommandLineFolder folder;
         folder.put("points.csv", "Number,Northing\n" + QByteArray("1,2.5\n").repeated(100'000) + "1,x\n");

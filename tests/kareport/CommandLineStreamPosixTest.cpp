@@ -64,7 +64,7 @@ TEST(CommandLineStream, WhatIsNoFileGetsTheWholeReportOrNothing)
     ASSERT_EQ(mkfifo(qPrintable(folder.path("out.txt")), 0600), 0);
     folder.put("points.csv", "Number,Northing\n1,x\n");
     folder.put("job.json", folder.bytesOf("job.json").replace("]}\n", "], \"output\": [\"out.txt\"]}"));
-    // Nobody reads the pipe: opening it would wait for ever.
+    // Nothing reads the pipe: opening it would never return.
     const ProgramRun run = folder.run("render job.json");
     EXPECT_EQ(run.status, 2) << run.all().constData();
 }
@@ -132,7 +132,7 @@ TEST(CommandLineStream, ACsvThatIsCutShortMeanwhileFailsItsJobAlone)
     EXPECT_EQ(folder.bytesOf("last.rep"), jobReport()) << "the rest of the batch is made";
 }
 
-/// A pipe for the standard output of a program, whose reader stands here.
+/// A pipe for the standard output of a program, whose reader is here.
 class OutputPipe
 {
 public:
@@ -173,7 +173,7 @@ private:
     int ends_[2] = {-1, -1};
 };
 
-/// Runs the program with a pipe for standard output, whose reader goes as soon as a part of the work is done.
+/// Runs the program with a pipe for standard output, whose reader ends as soon as a part of the work is done.
 ProgramRun runUntilReaderGoes(const QString &folder, const char *line, bool isIgnored)
 {
     QProcess process;

@@ -4,7 +4,7 @@
 
 #include <gtest/gtest.h>
 
-// A report that becomes one file of text goes there while it is made. Nothing of that may show but its speed.
+// A report that becomes one file of text is written there while it is made. Nothing of that may show except its speed.
 
 namespace
 {

@@ -7,7 +7,7 @@
 namespace
 {
 
-/// A folder with a program in the place of the desktop program, which notes what it is started with.
+/// A folder with a program instead of the desktop program, which notes what it is started with.
 class ViewFolder : public JobFolder
 {
 public:

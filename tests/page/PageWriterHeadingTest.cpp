@@ -176,7 +176,7 @@ TEST(PageWriterHeading, ClearingEmptiesTextAndHeadingAndBeginsPageOneWithTheNext
     EXPECT_EQ(writer.lineNumber(), 8);
 }
 
-/// Writes down what it is told.
+/// Records its notifications.
 class Recorder : public kareport::PageWriterObserver
 {
 public:

@@ -29,7 +29,7 @@ qint64 endOfBlocks(qint64 size)
     return std::max<qint64>(1, (size + ReportText::blockSize - 1) / ReportText::blockSize) * ReportText::blockSize;
 }
 
-/// Whether everything from a position to the end of the last block, and the character behind it, is 0.
+/// Whether everything from a position to the end of the last block, and the character after it, is 0.
 bool isZeroFrom(const ReportText &text, qint64 from, qint64 end)
 {
     return std::all_of(text.data() + from, text.data() + end + 1, [](char16_t c) { return c == 0; });

@@ -73,7 +73,7 @@ TEST(ReplaceFilePosix, AReportThatDoesNotFitOnTheDiskStaysModified)
         const QTemporaryDir folder;
         const QString path = reportWithOldContent(folder);
         UReportDoc report;
-        ASSERT_TRUE(report.Write(QString(disk.size - 3, u'x'), 0)); // behind the mark of three bytes
+        ASSERT_TRUE(report.Write(QString(disk.size - 3, u'x'), 0)); // after the mark of three bytes
         bool saved = false;
         {
             const FileSizeLimit limit(disk.limit);

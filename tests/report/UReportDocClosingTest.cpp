@@ -80,7 +80,7 @@ TEST(UReportDocClosing, TheWindowsPaneThatShowsTheReportIsClosedOnce)
     EXPECT_EQ(gone, 1);
 }
 
-/// A window that looks at its report when it goes.
+/// A window that looks at its report when it is destroyed.
 class LastLookWindow : public TestReportWindow
 {
 public:

@@ -32,7 +32,7 @@ private:
     bool handler_;
 };
 
-/// A host document that is told when its report goes.
+/// A host document that is notified when its report is deleted.
 class Owner : public UDocument
 {
 public:

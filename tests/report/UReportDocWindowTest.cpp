@@ -6,7 +6,7 @@
 namespace
 {
 
-/// A report with a window that keeps what it is told.
+/// A report with a window that records its notifications.
 struct WindowedReport
 {
     explicit WindowedReport(const QString &title = QString())

@@ -130,7 +130,7 @@ TEST(CsvObjectList, ReadsALongFileInTurn)
 
 TEST(CsvObjectList, GoesBackAndForth)
 {
-    // Three batches: the first is read by whoever asks, the others ahead of it.
+    // Three batches: the first is read by the caller, the others ahead of it.
     constexpr std::size_t batch = kareport::RowBatch::most;
     constexpr std::size_t count = 2 * batch + 1000;
     const CsvFile file(numberedRows(count));

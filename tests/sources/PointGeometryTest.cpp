@@ -22,7 +22,7 @@ std::string_view viewOf(const QByteArray &bytes)
     return {bytes.constData(), static_cast<std::size_t>(bytes.size())};
 }
 
-/// A point as "x y z system", or what stands in its place.
+/// A point as "x y z system", or what is in its place.
 std::string textOf(const PointOrFault &read)
 {
     if (const auto *fault = std::get_if<QString>(&read)) {

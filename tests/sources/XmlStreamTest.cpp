@@ -11,7 +11,7 @@ namespace
 
 using namespace kareport;
 
-/// Writes down what it is told.
+/// Records its notifications.
 class Listener : public XmlHandler
 {
 public:

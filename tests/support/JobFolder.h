@@ -30,7 +30,7 @@ private:
 struct MarkedText
 {
     QByteArray text; ///< without the mark
-    QString place;   ///< of what stood behind the mark, as "line:column"
+    QString place;   ///< of what followed the mark, as "line:column"
 
     explicit MarkedText(const QByteArray &marked);
 };

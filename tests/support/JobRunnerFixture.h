@@ -27,7 +27,7 @@ class TestJob
 public:
     TestJob() { folder.put("t.xml", pointsTemplate()); }
 
-    /// Runs a job of this content behind `fixedFront`.
+    /// Runs a job of this content after `fixedFront`.
     void run(const QByteArray &content) { runWhole(fixedFront + content + '}'); }
     void runWhole(const QByteArray &json);
 

@@ -4,7 +4,7 @@
 #include <cstdlib>
 #include <limits>
 
-/// Memory that ends: blocks larger than a limit cannot be had. One at a time.
+/// Memory that ends: blocks larger than a limit cannot be allocated. One at a time.
 class LimitedMemory
 {
 public:
@@ -14,10 +14,10 @@ public:
         calls = 0;
         lastBytes = 0;
     }
-    /// Room for so many characters of one byte and the 0 behind them.
+    /// Room for so many characters of one byte and the 0 after them.
     static LimitedMemory ofCharacters(std::size_t characters) { return LimitedMemory(bytesFor(characters)); }
     static std::size_t bytesFor(std::size_t characters) { return characters + 1; }
-    /// Room for so many characters of UTF-16 and the 0 behind them.
+    /// Room for so many characters of UTF-16 and the 0 after them.
     static LimitedMemory ofWideCharacters(std::size_t characters) { return LimitedMemory(wideBytesFor(characters)); }
     static std::size_t wideBytesFor(std::size_t characters) { return (characters + 1) * sizeof(char16_t); }
 

@@ -7,7 +7,7 @@
 #include <QString>
 #include <QTemporaryDir>
 
-/// A template file in a folder of its own, which goes with this object.
+/// A template file in a folder of its own, which is removed with this object.
 class TemplateOnDisk
 {
 public:

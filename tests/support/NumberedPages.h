@@ -26,5 +26,5 @@ private:
     int count_;
 };
 
-/// The pages of a PDF, as somebody else counts them; -1 where there is none.
+/// The pages of a PDF, as another program counts them; -1 where there is none.
 int pagesIn(const QString &pdf);

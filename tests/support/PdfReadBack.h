@@ -13,7 +13,7 @@
 
 // PDFs read back with other people's tools.
 
-/// A word of a page and where it stands, in points from the sheet's upper left corner.
+/// A word of a page and where it is, in points from the sheet's upper left corner.
 struct PdfWord
 {
     QString text;
@@ -43,7 +43,7 @@ public:
     /// The text of every page, as it is laid out; empty lines do not count.
     QStringList pages() const { return textOfPages({QStringLiteral("-layout")}); }
 
-    /// The text of every page in columns of so many points, without the margin: blanks and empty lines as they stand.
+    /// The text of every page in columns of so many points, without the margin: blanks and empty lines included.
     QStringList columns(double pointsPerCharacter) const;
 
     /// All that is written on all pages, in the order of writing, without blanks and line ends.

@@ -20,7 +20,7 @@ public:
     int tops = 0;
 };
 
-/// A property pane that keeps what it is told.
+/// A property pane that records its notifications.
 class ToldPane : public CPropertyPane
 {
 public:
@@ -29,7 +29,7 @@ public:
     std::vector<UDocument *> told;
 };
 
-/// Reports of an application whose launches are recorded. Temporary names begin anew.
+/// Reports of an application whose launches are recorded. Temporary names begin again.
 class ReportEditor : public testing::Test
 {
 protected:

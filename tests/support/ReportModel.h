@@ -12,7 +12,7 @@
 /// A table of data, laid out.
 struct ModelTable
 {
-    QString name; ///< stands over the heading; empty for none
+    QString name; ///< the text above the heading; empty for none
     QString heading;
     QStringList rows;
     int before = 0;
@@ -47,7 +47,7 @@ public:
     void writeBlock(const QStringList &lines, int before, int after);
     /// The report has been read back from its file.
     void reload(const QString &text);
-    /// The view has put the same text with other line ends in the place of this one.
+    /// The view has put the same text with other line ends instead of this one.
     void withCrLf();
 
     /// Takes the starts as they are, where how they came about is no part of the model.

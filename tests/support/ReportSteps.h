@@ -37,7 +37,7 @@ enum class ReportOp
     CloseView,
     // of both
     Reload,
-    // of what is opened and closed, and of what goes on by itself
+    // of what is opened and closed, and of what happens by itself
     HidePane,
     ShowPane,
     WriteUnseen,

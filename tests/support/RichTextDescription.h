@@ -12,7 +12,7 @@
 
 #include <gtest/gtest.h>
 
-/// Documents in one line: paragraphs parted by "|", each with its formats in brackets and those of its pieces of text in
+/// Documents in one line: paragraphs separated by "|", each with its formats in brackets and those of its pieces of text in
 /// angle brackets. What a rich text has where it says nothing is not mentioned: 12 points, no colour, no indents.
 namespace richtext
 {
@@ -28,7 +28,7 @@ QString described(const QTextDocument &document);
 /// What is read of a whole file.
 QString shown(QByteArrayView bytes, kareport::RichTextNotes *notes = nullptr);
 
-/// What is read of a body: of what stands in the outermost group behind the first word.
+/// What is read of a body: of the outermost group after the first word.
 QString body(const QByteArray &bytes, kareport::RichTextNotes *notes = nullptr);
 
 /// A table of bodies, with the reason for each.

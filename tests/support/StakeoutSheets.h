@@ -10,7 +10,7 @@ class UReportView;
 
 constexpr int pagesOfStakeout = 8; ///< as the golden file has them
 
-/// Each sheet of a PDF begins with the header of its page of the list, which stands nowhere else.
+/// Each sheet of a PDF begins with the header of its page of the list, which is nowhere else.
 void expectStakeoutPages(const QByteArray &pdf, const char *reason);
 /// The same of what was printed into a file.
 void expectStakeoutSheets(const QString &path, const char *reason);

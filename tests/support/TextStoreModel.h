@@ -67,7 +67,7 @@ std::string rowOf(const Step &step);
 /// Characters of which no two neighbours are alike, none of them 0, and that differ from step to step.
 QString lettersOf(Letters kind, qint64 count, quint64 salt);
 
-/// A text that is given steps, beside a plain string that is given the same.
+/// A text that is given steps, together with a plain string that is given the same.
 class Run
 {
 public:
@@ -83,7 +83,7 @@ private:
     qint64 place(qint64 at) const;
     qint64 rest(qint64 at, qint64 count) const { return count % (model_.size() - at + 1); }
 
-    /// What an operation that needs memory answered: false only where memory has ended.
+    /// What an operation that needs memory answered: false only where memory ran out.
     bool answered(bool answer);
 
     void carryOut(const Step &step);

@@ -8,12 +8,12 @@
 #include <algorithm>
 #include <vector>
 
-/// Numbers and pages, for whoever reads what is wrong.
+/// Numbers and pages, for the reader of a failure.
 QString joined(const std::vector<qint64> &numbers);
 
 QString shown(const std::vector<kareport::ReportPage> &pages);
 
-/// A text for whoever reads what is wrong, without the greater part of a long one.
+/// A text for the reader of a failure, without the greater part of a long one.
 QString brief(const QString &text);
 
 /// What a view shows of a text.

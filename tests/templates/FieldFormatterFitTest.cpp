@@ -67,7 +67,7 @@ TEST(FieldFormatterFit, CentresEveryTextInItsColumn)
     for (int length = 0; length <= 12; ++length) {
         for (int width = 0; width <= 12; ++width) {
             const int missing = width - length;
-            // Half of the blanks before, at least one; the odd one behind.
+            // Half of the blanks before, at least one; the odd one after.
             const int before = missing <= 0 ? 0 : missing == 1 ? 1 : missing / 2;
             const int behind = missing <= 0 ? 0 : missing == 1 ? 1 : missing - missing / 2;
             const QString text(length, u'x');

@@ -114,7 +114,7 @@ TEST(HostileTemplate, TemplatesThatNobodyClosesAreNone)
 
 TEST(HostileTemplate, CutsThatJoinToTagsAgainAndAgain)
 {
-    // Each cut joins the "<" before it with what stands behind to the next opening tag.
+    // Each cut joins the "<" before it with what follows to the next opening tag.
     constexpr int depth = 20000;
     QByteArray list(depth, '<');
     list += "Field><VariableName>A</VariableName></Field>";
@@ -185,7 +185,7 @@ TEST(HostileTemplate, ChecksManyFieldsWithARemarkOnEach)
 {
     const QByteArray bytes = templateOf(tableOfShortFields(many) + dictionaryOf(1));
     const auto remarks = kareport::checkTemplates(kareport::TemplateFile(bytes));
-    // All fields but the first lack their variable, and the characters behind all of them go.
+    // All fields but the first lack their variable, and the characters after all of them are dropped.
     EXPECT_EQ(remarks.size(), std::size_t(2 * many - 1));
 }
 

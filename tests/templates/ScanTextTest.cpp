@@ -45,7 +45,7 @@ TEST(ScanText, AppendsPiecesFromDifferentPlaces)
 {
     ScanText text;
     text.append(u"ab", 10);
-    text.append(u"cd", 12); // goes on where the first piece ended
+    text.append(u"cd", 12); // continues where the first piece ended
     text.append(u"", 99);   // no character, no place
     text.append(u"ef", 30);
     EXPECT_EQ(text.text(), QStringLiteral("abcdef"));

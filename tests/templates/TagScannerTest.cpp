@@ -139,7 +139,7 @@ TEST(TagScanner, NameClosedByTheShortFormIsReadAndTakesFourCharactersWithIt)
 struct SequenceRow
 {
     const char16_t *text;
-    const char16_t *values; ///< with "|" behind each
+    const char16_t *values; ///< with "|" after each
     const char *reason;
 };
 

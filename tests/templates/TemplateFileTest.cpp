@@ -68,7 +68,7 @@ constexpr qsizetype chunk = 4095;
 struct ZeroRow
 {
     qsizetype size;
-    qsizetype zero; ///< where the zero byte stands among "x"
+    qsizetype zero; ///< where the zero byte is among "x"
     qsizetype kept;
     const char *reason;
 };
@@ -99,7 +99,7 @@ TEST(TemplateFile, ZeroBytesInSeveralChunksEndEachItsOwn)
     std::fill(bytes.begin() + chunk, bytes.begin() + 2 * chunk, 'b');
     std::fill(bytes.begin() + 2 * chunk, bytes.end(), 'c');
     bytes[2] = '\0';
-    bytes[7] = '\0'; // behind the first, in what is dropped already
+    bytes[7] = '\0'; // after the first, in what is dropped already
     bytes[chunk + 3] = '\0';
     bytes[2 * chunk + 1] = '\0';
     EXPECT_EQ(TemplateFile(bytes).text(), QStringLiteral("aabbbc"));
@@ -199,7 +199,7 @@ TEST(TemplateFile, CannotReadWhatIsNoFile)
 
 TEST(TemplateFile, IsReadForScanningAsItsTextIsScanned)
 {
-    // Bytes of every kind beside each other: what is stripped, what stands just beside it, zeros, pieces of characters.
+    // Bytes of every kind next to each other: what is stripped, what is just next to it, zeros, pieces of characters.
     const std::vector<QByteArray> pieces = {"\t",
                                             "\n",
                                             "\r",

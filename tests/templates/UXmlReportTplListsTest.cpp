@@ -7,7 +7,7 @@
 
 #include <gtest/gtest.h>
 
-// The lists of a template: where they end, which of several records of one name counts, what stands around them.
+// The lists of a template: where they end, which of several records of one name counts, what surrounds them.
 
 using markup::element;
 using markup::field;

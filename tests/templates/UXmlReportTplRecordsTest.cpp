@@ -41,7 +41,7 @@ std::string shown(const sXmlReportFields &fields)
 
 TEST(UXmlReportTplRecords, CutsATablesPartsInTheirOrder)
 {
-    // The first name in the table is its own, whatever stands behind; so with the other parts.
+    // The first name in the table is its own, whatever follows; so with the other parts.
     const LoadedTemplate loaded(templateOf("<Tables><Table><Sort><VariableName>B</VariableName></Sort>"
                                            "<OutputList><Field><Align>RIGHT</Align><VariableName>A</VariableName>"
                                            "<Label> La bel </Label><Format>10.3</Format></Field></OutputList>"

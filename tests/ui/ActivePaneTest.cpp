@@ -102,7 +102,7 @@ TEST_F(ActivePane, WhateverBringsAPaneToTheFrontMakesItTheActiveOne)
     EXPECT_EQ(desk.frame->GetActiveView(), nullptr);
 }
 
-/// Keeps what it is told of being active.
+/// Records the notifications of being active.
 class ToldView : public UReportView
 {
 public:
@@ -279,7 +279,7 @@ TEST_F(ActivePane, AnEditorThatHidesAPaneDoesNotKeepAReport)
     const PreferredEditor editor(QStringLiteral("notepad.exe"));
     const RecordedLaunches launches;
     report->SetExternalEditorFlag(true);
-    report->UpdateAllViews(nullptr); // the editor gets the report, and the first pane goes
+    report->UpdateAllViews(nullptr); // the editor gets the report, and the first pane closes
     ASSERT_EQ(launches.all.size(), 1U);
     ASSERT_FALSE(dockPaneOf(*report).IsVisible());
     EXPECT_EQ(dockPaneOf(*report).GetWindowNumber(), 0);

@@ -53,7 +53,7 @@ TEST(LineWidth, IsTheWidthThatTheLineIsDrawnWith)
         QStringLiteral("ÄÖÜäöüßéèàçñ"),
         QStringLiteral("Ωαβγ Привет ∞ ≤ → ─│┌"),
         QStringLiteral("測点 標高 カタカナ ひらがな ｱｲｳ"),
-        QStringLiteral("e\u0301 a\u0308"),      // marks that stand on the character before
+        QStringLiteral("e\u0301 a\u0308"),      // marks that are on the character before
         QStringLiteral("العربية"),              // letters that join
         QStringLiteral("\U0001F4CF\U0001F4D0"), // pairs
         QStringLiteral("a\tb\r\n"),

@@ -22,7 +22,7 @@ namespace
 {
 
 constexpr std::array<unsigned, 3> ids = {11007, 11009, 11011};
-constexpr double leastContrast = 3; // what a sign needs to be told from its ground
+constexpr double leastContrast = 3; // what a sign needs to be distinguished from its background
 
 /// Gives the application other colours for a time.
 class Theme
@@ -60,7 +60,7 @@ double luminance(const QColor &color)
     return 0.2126 * linear(color.redF()) + 0.7152 * linear(color.greenF()) + 0.0722 * linear(color.blueF());
 }
 
-/// 1 for colours that cannot be told apart, 21 for black and white.
+/// 1 for colours that cannot be distinguished, 21 for black and white.
 double contrast(const QColor &a, const QColor &b)
 {
     const auto [low, high] = std::minmax({luminance(a), luminance(b)});
@@ -72,7 +72,7 @@ QImage drawn(unsigned id, int size, qreal ratio, QIcon::Mode mode = QIcon::Norma
     return kareport::reportIcon(id).pixmap(QSize(size, size), ratio, mode).toImage();
 }
 
-/// The contrasts of an icon's dots to the button that it stands on.
+/// The contrasts of an icon's dots to the button that it is drawn on.
 std::vector<double> contrastsOf(const QImage &icon)
 {
     QImage button(icon.size(), QImage::Format_RGB32);

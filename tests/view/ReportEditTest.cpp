@@ -26,7 +26,7 @@ namespace
 using kareport::ReportChange;
 using kareport::ReportEdit;
 
-/// A control that keeps what it was told of edits.
+/// A control that records the edits that it was notified of.
 struct Edited
 {
     explicit Edited(const QString &text)

@@ -140,7 +140,7 @@ TEST(ReportViewWidget, AsksForAPageByTheKeyboard)
     EXPECT_EQ(widget.currentPage(), 9);
 }
 
-/// Counts the times that a widget is laid out anew.
+/// Counts the times that a widget is laid out again.
 class LayoutCount : public QObject
 {
 public:

@@ -251,7 +251,7 @@ TEST(UReportViewCommands, ExitDefersTheClosingOfAReportWithAWindow)
     ClosingFrame frame;
     ShownReport t(QStringLiteral("a"));
     UReportView &view = t.open();
-    t.report.SetReportWindow(new TestReportWindow); // goes with the report
+    t.report.SetReportWindow(new TestReportWindow); // destroyed with the report
     EXPECT_TRUE(view.runCommand(57665));
     EXPECT_EQ(frame.closed, 1);
     t.report.CloseReportDocument();

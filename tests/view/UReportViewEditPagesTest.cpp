@@ -58,7 +58,7 @@ std::vector<Kind> kinds()
             {true, QStringLiteral("b"), "a rich-text image, with a blank after each line"}};
 }
 
-/// Removes what stands between the middle of the first page's last line and the cursor.
+/// Removes what is between the middle of the first page's last line and the cursor.
 void joinWithLineBefore(ReportEdit &edit)
 {
     QTextCursor cursor = edit.textCursor();
@@ -71,7 +71,7 @@ TEST(UReportViewEditPages, TheFirstEditCarriesTheRecordAlong)
 {
     struct Row
     {
-        const char *at; ///< the cursor stands before it
+        const char *at; ///< the cursor is before it
         int length;     ///< of what is selected
         void (*act)(ReportEdit &edit);
         QStringList expected;

@@ -325,7 +325,7 @@ TEST(UReportViewEdit, FormatsGoWithATextThatAHostSets)
     }
 }
 
-/// A view that keeps whether the report was modified when it was told of a change.
+/// A view that keeps whether the report was modified when it was notified of a change.
 class WatchingView : public UView
 {
 public:
