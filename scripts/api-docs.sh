@@ -9,7 +9,7 @@ cd "$(dirname "$0")/.."
 folder=${1:-out/api}
 mkdir -p "$folder"
 
-# They are shown as they are installed. Functions that stand outside of a class are shown where the file says that it is
+# They are shown as they are installed. Functions that are outside of a class are shown where the file says that it is
 # documented.
 rm -rf "$folder/include"
 mkdir -p "$folder/include/KaReport"

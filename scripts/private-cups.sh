@@ -5,7 +5,7 @@
 #
 # The jobs of the default queue, Whole, arrive as FOLDER/arrived/job.pdf; Refusing takes no jobs, Stopped keeps them.
 # The server needs neither systemd nor D-Bus, listens on a socket in the folder only, and ends with the command. Its process
-# number stands in FOLDER/server.pid. Exits with the command's status, or with 77 where no server can be started.
+# number is in FOLDER/server.pid. Exits with the command's status, or with 77 where no server can be started.
 set -euo pipefail
 
 folder=$(realpath -m "$1")

@@ -5,7 +5,7 @@
 #
 # The server listens on a socket in the folder only and ends with the command. The command finds it by PGHOST; the user
 # survey may do everything in the database survey, the user guarded needs the password "open sesame". The server refuses
-# to run as root: then it runs as the user postgres, or nobody. Its process number stands in FOLDER/server.pid. Exits with
+# to run as root: then it runs as the user postgres, or nobody. Its process number is in FOLDER/server.pid. Exits with
 # the command's status, or with 77 where no server can be started.
 set -euo pipefail
 

@@ -1,4 +1,4 @@
-# Writes `batch`, a file that includes the test `files`. Each stands in a namespace of its own, so that two may use one name;
+# Writes `batch`, a file that includes the test `files`. Each is in a namespace of its own, so that two may use one name;
 # their headers are included before it.
 set(headers)
 set(tests)
