@@ -33,7 +33,7 @@ foreach(layer IN LISTS KA_HOST_LAYERS)
     endif()
 endforeach()
 
-# What a program outside links: KaReport::KaReport is the module with its are-in host. A host that brings a library of its
+# What a program outside links: KaReport::KaReport is the module with its stand-in host. A host that brings a library of its
 # own compiles that with KaReport::Headers, and links it with KaReport::Module.
 add_library(ka_package_headers INTERFACE)
 set_target_properties(ka_package_headers PROPERTIES EXPORT_NAME Headers)
