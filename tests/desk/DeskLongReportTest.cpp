@@ -24,7 +24,7 @@
 namespace
 {
 
-constexpr int lineCount = 100'000; // more than are read in a moment
+constexpr int lineCount = 200'000; // more than are read in a moment
 
 QByteArray longFile(int lines = lineCount, const char *first = "TALVEN first line")
 {
