@@ -43,13 +43,13 @@ void PointRows::startReading()
                                               isReaderHeard_ ? passNotes_ : unheard_);
     isMore_ = true;
     index_ = 0;
-    isKept_ = false;
     seen_.clear();
 }
 
 void PointRows::rewind()
 {
     error_.reset();
+    isKept_ = false;
     startReading();
 }
 
@@ -186,9 +186,9 @@ bool ProjectedRows::next()
             route_ = nullptr;
             return false;
         }
-        // The file has been read through, and all was said.
+        // The file has been read through, and all was said. Rows that are to be kept still are.
         isReaderHeard_ = false;
-        rewind();
+        startReading();
     }
     return route_ != nullptr && PointRows::next();
 }

@@ -29,6 +29,8 @@ public:
 protected:
     /// Takes the point at hand. @return false when something is wrong with it
     virtual bool take();
+    /// Reads the file from its start.
+    void startReading();
 
     static const std::size_t ownVariables; ///< how many `PointRows` itself has
 
@@ -41,7 +43,6 @@ private:
     struct Variables;
 
     bool readMore();
-    void startReading();
     bool isOfSurfaces() const { return source_.query.kind == LandXmlListKind::SurfacePoints; }
     void noteRepeated();
 

@@ -87,6 +87,17 @@ TEST(LandXmlOffsets, AreSortedAndReadAgain)
     EXPECT_EQ(file.notes(), QStringList(u"Roadways: 1 in the file, which no list reads"_qs)) << "each is counted once";
 }
 
+TEST(LandXmlOffsets, AreSortedBeforeAnyIsRead)
+{
+    LandXmlFile file(
+        fileOf(alignment(bend()) +
+               "<CgPoints><CgPoint name='1'>1090 500</CgPoint><CgPoint name='2'>1010 500</CgPoint></CgPoints>"),
+        queryOf(Kind::OffsetsOf), {QStringLiteral("Name"), QStringLiteral("Station")});
+    file.list->Sort({file.id("Station")});
+    EXPECT_EQ(file.rows(0), QStringList({u"2|10"_qs, u"1|90"_qs}));
+    EXPECT_EQ(file.row(0, 0), u"2|10"_qs);
+}
+
 TEST(LandXmlOffsets, AnAlignmentWithoutGeometryIsAnError)
 {
     LandXmlFile file(fileOf("\n<Alignments><Alignment name='x'/></Alignments>" + points("1 2")),
