@@ -164,12 +164,13 @@ TEST(ReportSaves, AFullDiskIsSaidInTheSystemsWords)
 TEST(ReportSaves, AFileThatCannotTakeItsPlaceIsSaidInTheSystemsWords)
 {
     const QTemporaryDir folder;
+    const QString path = folder.filePath(QStringLiteral("a.rep"));
     const ShownReport shown(longText());
+    putFile(path, "earlier");
     QString problem;
     const FailingFiles failing(Call::Rename, 1);
     EXPECT_FALSE(kareport::replaceFile(
-        folder.filePath(QStringLiteral("a.rep")),
-        [&shown](QIODevice &device) { return shown.report.WriteText(device, kareport::LineEnds::ReportFile); },
+        path, [&shown](QIODevice &device) { return shown.report.WriteText(device, kareport::LineEnds::ReportFile); },
         &problem));
     EXPECT_TRUE(failing.hasFailed());
     EXPECT_TRUE(problem.contains(QStringLiteral("Permission denied"))) << problem.toStdString();
