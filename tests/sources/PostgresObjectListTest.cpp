@@ -224,15 +224,21 @@ TEST_F(PostgresServer, GivesTheRowsThatATextGives)
     kareport::CsvObjectList text(std::get<std::shared_ptr<const kareport::FileBytes>>(file), kareport::CsvDialect(),
                                  survey::variables(), {});
     PostgresObjectList list(query("SELECT * FROM points"), survey::variables(), {});
-    const QStringList rows = survey::rowsOf(list);
-    const QStringList expected = survey::rowsOf(text);
-    ASSERT_EQ(rows.size(), expected.size());
-    for (qsizetype i = 0; i < rows.size(); ++i) {
-        ASSERT_EQ(rows[i].toStdString(), expected[i].toStdString()) << i;
-    }
+    // A database gives its rows in an order of its own.
+    const auto inAnyOrder = [](QStringList rows) {
+        rows.sort();
+        return rows.join(u'\n').toStdString();
+    };
+    EXPECT_EQ(inAnyOrder(survey::rowsOf(list)), inAnyOrder(survey::rowsOf(text)));
     list.Sort({survey::numberId, survey::northingId});
     text.Sort({survey::numberId, survey::northingId});
-    EXPECT_EQ(survey::rowsOf(list), survey::rowsOf(text)) << "sorted";
+    const QStringList sorted = survey::rowsOf(list);
+    const QStringList expected = survey::rowsOf(text);
+    EXPECT_EQ(inAnyOrder(sorted), inAnyOrder(expected)) << "sorted";
+    ASSERT_EQ(sorted.size(), expected.size());
+    for (qsizetype i = 0; i < sorted.size(); ++i) {
+        ASSERT_EQ(sorted[i].section(u' ', 0, 1), expected[i].section(u' ', 0, 1)) << "row " << i;
+    }
 }
 
 TEST_F(PostgresServer, RowsAreOfOneState)
