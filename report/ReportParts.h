@@ -50,6 +50,7 @@ struct ReportParts
     // Files
     QString saveProblem;
     bool openedFromRtf = false;
+    bool openedWithoutMemory = false; ///< the last opening, or loading, found no memory for what it opens
     bool isSerializing = false;
 
     // The host's object whose text this is

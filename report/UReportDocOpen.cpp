@@ -85,7 +85,13 @@ bool UReportDoc::OnNewDocument()
 bool UReportDoc::OnOpenDocument(const QString &path)
 {
     parts_->openedFromRtf = namesRichText(path);
-    if (!kareport::whileMemoryLasts(false, [&] { return UDocument::OnOpenDocument(path); })) {
+    parts_->openedWithoutMemory = false;
+    bool isOpened = false;
+    const bool isTried = kareport::doneWhileMemoryLasts([&] { isOpened = UDocument::OnOpenDocument(path); });
+    if (!isTried && IsReportAvailable(this)) {
+        parts_->openedWithoutMemory = true;
+    }
+    if (!isOpened) {
         return false;
     }
     SetPageSize();
@@ -97,8 +103,9 @@ void UReportDoc::Serialize(UArchive &archive)
     if (archive.IsStoring()) {
         // As many bytes as the text has characters, which is the first half of it: what reads such archives counts on
         // that length.
-        archive.Write(QByteArrayView(reinterpret_cast<const char *>(GetData()), GetText().size()));
-        if (GetText().size() != GetTextLength() || HasLostText()) {
+        const bool isTaken = kareport::doneWhileMemoryLasts(
+            [&] { archive.Write(QByteArrayView(reinterpret_cast<const char *>(GetData()), GetText().size())); });
+        if (!isTaken || GetText().size() != GetTextLength() || HasLostText()) {
             archive.Abandon(); // there is no memory for it in UTF-16, or there was none for all of it
         }
         return;
@@ -140,15 +147,23 @@ int UReportDoc::LoadFile(const QString &path, bool keepLineEnds)
         return 0;
     }
     // Rich text is opened as a document; its source is what is loaded then.
-    const bool isDocument = kareport::whileMemoryLasts(
-        false, [&] { return !parts_->isSerializing && namesRichText(path) && holdsRichText(path); });
-    if (isDocument) {
-        OnOpenDocument(path);
-        return 1;
-    }
+    bool isDocument = false;
     std::optional<QFile> file;
-    if (!kareport::whileMemoryLasts(false, [&] { return file.emplace(path).open(QIODevice::ReadOnly); })) {
+    bool isOpen = false;
+    const bool isTried = kareport::doneWhileMemoryLasts([&] {
+        isDocument = !parts_->isSerializing && namesRichText(path) && holdsRichText(path);
+        isOpen = isDocument || file.emplace(path).open(QIODevice::ReadOnly);
+    });
+    if (!isTried) {
+        parts_->openedWithoutMemory = true;
+    }
+    if (!isTried || !isOpen) {
         return 0;
+    }
+    if (isDocument) {
+        // What the opening answers counts for nothing: a document that was too large was said to be.
+        const bool isOpened = OnOpenDocument(path);
+        return !isOpened && IsReportAvailable(this) && parts_->openedWithoutMemory ? 0 : 1;
     }
     const qint64 before = GetTextLength();
     const bool isWhole = parts_->page.losesNothing([&] {
@@ -159,6 +174,7 @@ int UReportDoc::LoadFile(const QString &path, bool keepLineEnds)
         }
     });
     file.reset();
+    parts_->openedWithoutMemory = parts_->openedWithoutMemory || !isWhole;
     UpdateAllViews(nullptr, 0, nullptr); // may hand the report to an editor and close it
     return isWhole ? 1 : 0;
 }

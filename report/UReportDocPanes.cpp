@@ -96,15 +96,17 @@ kareport::ReportWindow *UReportDoc::GetReportWindow() const
 void UReportDoc::SetReportWindowActive()
 {
     if (kareport::ReportWindow *window = GetReportWindow()) {
-        window->setActive(true);
-        window->takeFocus();
+        kareport::doneWhileMemoryLasts([window] {
+            window->setActive(true);
+            window->takeFocus();
+        });
     }
 }
 
 void UReportDoc::ShowReportBar(kareport::ReportWindow *window, bool show)
 {
     if (window != nullptr) {
-        window->showBar(show);
+        kareport::doneWhileMemoryLasts([window, show] { window->showBar(show); });
     }
 }
 

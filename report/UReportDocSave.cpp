@@ -11,6 +11,7 @@
 #include "ReportSaveName.h"
 #include "ReportTextCodec.h"
 #include "ReportViews.h"
+#include "StandardText.h"
 #include "UView.h"
 #include "WaitCursor.h"
 #include "Xlate.h"
@@ -180,7 +181,8 @@ bool UReportDoc::WriteText(QIODevice &device, kareport::LineEnds lineEnds) const
 bool UReportDoc::WritePdf(QIODevice &device, kareport::PdfNotes *notes,
                           const std::function<bool(qint64, qint64)> &progress) const
 {
-    return !HasLostText() && kareport::whileMemoryLasts(false, [&] {
+    bool isWritten = false;
+    const auto write = [&] {
         const kareport::PageLayout &layout = parts_->layout;
         const kareport::PageGeometry &geometry = layout.geometry();
         kareport::PdfOptions options;
@@ -191,8 +193,14 @@ bool UReportDoc::WritePdf(QIODevice &device, kareport::PdfNotes *notes,
             // The text of the document, not its source.
             const QString shown = kareport::shownPlainText(*this);
             options.pageStarts = kareport::pageHeadersIn(shown);
-            return kareport::writePdf(device, QStringView(shown), options, notes);
+            isWritten = kareport::writePdf(device, QStringView(shown), options, notes);
+            return;
         }
-        return parts_->page.text().visit([&](auto text) { return kareport::writePdf(device, text, options, notes); });
-    });
+        isWritten =
+            parts_->page.text().visit([&](auto text) { return kareport::writePdf(device, text, options, notes); });
+    };
+    if (!HasLostText() && !kareport::doneWhileMemoryLasts(write) && notes != nullptr) {
+        notes->problem = kareport::noMemoryText();
+    }
+    return isWritten;
 }

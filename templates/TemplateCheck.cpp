@@ -2,6 +2,8 @@
 
 #include "FieldMarker.h"
 #include "LeadingInteger.h"
+#include "MemoryLasts.h"
+#include "StandardText.h"
 #include "TagLint.h"
 #include "TemplateElements.h"
 #include "TemplateRecords.h"
@@ -284,14 +286,7 @@ void Checker::addNotes()
     }
 }
 
-} // namespace
-
-std::vector<TemplateRemark> checkTemplates(const TemplateFile &file)
-{
-    return Checker(file).check();
-}
-
-std::optional<TemplateRemark> firstUnreadTemplate(const TemplateFile &file)
+std::optional<TemplateRemark> firstUnread(const TemplateFile &file)
 {
     ScanNotes notes;
     readTemplateElements(file.scanText(), &notes);
@@ -301,6 +296,31 @@ std::optional<TemplateRemark> firstUnreadTemplate(const TemplateFile &file)
         }
     }
     return std::nullopt;
+}
+
+TemplateRemark noMemory()
+{
+    return {TextPlace(), true, noMemoryText()};
+}
+
+} // namespace
+
+std::vector<TemplateRemark> checkTemplates(const TemplateFile &file)
+{
+    std::vector<TemplateRemark> remarks;
+    if (!doneWhileMemoryLasts([&] { remarks = Checker(file).check(); })) {
+        remarks.push_back(noMemory());
+    }
+    return remarks;
+}
+
+std::optional<TemplateRemark> firstUnreadTemplate(const TemplateFile &file)
+{
+    std::optional<TemplateRemark> remark;
+    if (!doneWhileMemoryLasts([&] { remark = firstUnread(file); })) {
+        remark = noMemory();
+    }
+    return remark;
 }
 
 } // namespace kareport

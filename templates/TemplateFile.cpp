@@ -1,5 +1,6 @@
 #include "TemplateFile.h"
 
+#include "MemoryLasts.h"
 #include "ScanText.h"
 
 #include <QByteArray>
@@ -97,22 +98,26 @@ TemplateFile::TemplateFile(QByteArrayView bytes)
 
 std::optional<TemplateFile> TemplateFile::read(const QString &path)
 {
-    const auto bytes = bytesOf(path);
-    return bytes ? std::optional(TemplateFile(*bytes)) : std::nullopt;
+    return whileMemoryLasts(std::optional<TemplateFile>(), [&path] {
+        const auto bytes = bytesOf(path);
+        return bytes ? std::optional(TemplateFile(*bytes)) : std::nullopt;
+    });
 }
 
 std::optional<QString> TemplateFile::readScanned(const QString &path)
 {
-    auto bytes = bytesOf(path);
-    if (!bytes) {
-        return std::nullopt;
-    }
-    const bool utf8 = isUtf8(*bytes);
-    if (bytes->contains('\0')) {
-        bytes = withoutZeroTails(*bytes);
-    }
-    strip(*bytes);
-    return decoded(*bytes, utf8);
+    return whileMemoryLasts(std::optional<QString>(), [&path]() -> std::optional<QString> {
+        auto bytes = bytesOf(path);
+        if (!bytes) {
+            return std::nullopt;
+        }
+        const bool utf8 = isUtf8(*bytes);
+        if (bytes->contains('\0')) {
+            bytes = withoutZeroTails(*bytes);
+        }
+        strip(*bytes);
+        return decoded(*bytes, utf8);
+    });
 }
 
 ScanText TemplateFile::scanText() const

@@ -18,10 +18,10 @@ class ScanText;
 class KAREPORT_EXPORT TemplateFile
 {
 public:
-    /// The text of the bytes of a file.
+    /// The text of the bytes of a file. @throws std::bad_alloc
     explicit TemplateFile(QByteArrayView bytes);
 
-    /// Reads a file; nothing when it cannot be opened or read.
+    /// Reads a file; nothing when it cannot be opened or read, or memory ends.
     static std::optional<TemplateFile> read(const QString &path);
     /// Reads a file's text as it is scanned, for code that does not report places in the file.
     static std::optional<QString> readScanned(const QString &path);
@@ -29,6 +29,7 @@ public:
     /// The text as it is in the file.
     const QString &text() const { return text_; }
     /// The text that is scanned: without tabs, line feeds and carriage returns, which also values lose.
+    /// @throws std::bad_alloc
     ScanText scanText() const;
 
 private:

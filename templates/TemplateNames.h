@@ -12,6 +12,7 @@ namespace kareport
 {
 
 /// All templates of a file, in file order, without one being chosen.
+/// @throws std::bad_alloc: some of them would be taken for all
 KAREPORT_EXPORT std::vector<sXmlReportTemplateInfo> templateInfos(const TemplateFile &file);
 /// The names of all templates of a file, in file order.
 KAREPORT_EXPORT QStringList templateNames(const TemplateFile &file);

@@ -29,6 +29,21 @@ auto findByName(const Records &records, Member member, const QString &name) -> d
     return found == records.end() ? nullptr : &*found;
 }
 
+/// Lists what all templates have; nothing where memory ends, as some of it would be taken for all.
+void listTemplates(const std::vector<sXmlReportTemplateInfo> &templates, QString sXmlReportTemplateInfo::*member,
+                   QStringList &texts)
+{
+    texts.clear();
+    const bool isWhole = kareport::doneWhileMemoryLasts([&] {
+        for (const auto &info : templates) {
+            texts.append(info.*member);
+        }
+    });
+    if (!isWhole) {
+        texts.clear();
+    }
+}
+
 } // namespace
 
 UXmlReportTpl::UXmlReportTpl() : xml_(std::make_unique<kareport::ScanText>())
@@ -263,22 +278,12 @@ QString UXmlReportTpl::GetTemplateTitle() const
 
 void UXmlReportTpl::GetAllTPLsByName(QStringList &names) const
 {
-    names.clear();
-    kareport::doneWhileMemoryLasts([&] {
-        for (const auto &info : templates_) {
-            names.append(info.Name);
-        }
-    });
+    listTemplates(templates_, &sXmlReportTemplateInfo::Name, names);
 }
 
 void UXmlReportTpl::GetAllTPLsByTitle(QStringList &titles) const
 {
-    titles.clear();
-    kareport::doneWhileMemoryLasts([&] {
-        for (const auto &info : templates_) {
-            titles.append(info.Title);
-        }
-    });
+    listTemplates(templates_, &sXmlReportTemplateInfo::Title, titles);
 }
 
 void UXmlReportTpl::GetAllTables(QStringList &names) const

@@ -42,9 +42,9 @@ public:
     /// The title of the chosen template: of several with its name, the first one's; "" when no template has the name.
     QString GetTemplateTitle() const;
 
-    /// Replaces the list by the names of all templates of the file, in file order.
+    /// Replaces the list by the names of all templates of the file, in file order; by none when memory ends.
     void GetAllTPLsByName(QStringList &names) const;
-    /// Replaces the list by the titles of all templates of the file, in file order.
+    /// Replaces the list by the titles of all templates of the file, in file order; by none when memory ends.
     void GetAllTPLsByTitle(QStringList &titles) const;
     /// Replaces the list by the names of the chosen template's tables, in file order.
     void GetAllTables(QStringList &names) const;

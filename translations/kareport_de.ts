@@ -29,6 +29,11 @@
         <translation>Die Datei ist zu groß und kann nicht geöffnet werden.</translation>
     </message>
     <message>
+        <location filename="../host/app/StandardText.cpp"/>
+        <source>there is not enough memory for it</source>
+        <translation>Der Speicher reicht dafür nicht aus</translation>
+    </message>
+    <message>
         <location filename="../host/frame/UDocument.cpp"/>
         <source>Save changes to %1?</source>
         <translation>Änderungen an %1 speichern?</translation>
@@ -2647,11 +2652,6 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
         <location filename="../apps/kareport-desk/SavedReports.cpp"/>
         <source>it is too large</source>
         <translation>Die Datei ist zu groß</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/SavedReports.cpp"/>
-        <source>there is not enough memory for it</source>
-        <translation>Der Speicher reicht dafür nicht aus</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/SavedReports.cpp"/>

@@ -29,6 +29,11 @@
         <translation>ファイルが大きすぎて開けません。</translation>
     </message>
     <message>
+        <location filename="../host/app/StandardText.cpp"/>
+        <source>there is not enough memory for it</source>
+        <translation>メモリが足りません</translation>
+    </message>
+    <message>
         <location filename="../host/frame/UDocument.cpp"/>
         <source>Save changes to %1?</source>
         <translation>%1 への変更を保存しますか?</translation>
@@ -2647,11 +2652,6 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
         <location filename="../apps/kareport-desk/SavedReports.cpp"/>
         <source>it is too large</source>
         <translation>ファイルが大きすぎます</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/SavedReports.cpp"/>
-        <source>there is not enough memory for it</source>
-        <translation>メモリが足りません</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/SavedReports.cpp"/>

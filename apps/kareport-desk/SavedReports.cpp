@@ -8,6 +8,7 @@
 #include "ReportEntry.h"
 #include "RichTextReader.h"
 #include "SavedText.h"
+#include "StandardText.h"
 #include "TextFile.h"
 #include "UReportDoc.h"
 #include "UView.h"
@@ -54,7 +55,7 @@ std::optional<QString> readOther(const QString &path, OtherText &other)
     read.SetAutoDelete(false);
     read.SetRTFDataFlag(false); // in rich-text mode nothing is loaded
     if (!read.OnOpenDocument(path)) {
-        return Xlate("there is not enough memory for it");
+        return noMemoryText();
     }
     other.isFromRtf = read.IsOpenedFromRtf();
     other.text.pageStarts = read.GetPageStarts();

@@ -2,6 +2,7 @@
 
 #include "FileBytes.h"
 #include "MemoryLasts.h"
+#include "StandardText.h"
 #include "Xlate.h"
 
 #include <QFileInfo>
@@ -27,11 +28,6 @@ TextFile::State stateOf(TextLoading loading)
     }
 }
 
-QString noMemory()
-{
-    return Xlate("there is not enough memory for it");
-}
-
 TextFile::State readInto(TextFile &read, const QString &path, const LoadText &load, AsideState &state)
 {
     const auto file = FileBytes::open(path);
@@ -50,7 +46,7 @@ TextFile::State readInto(TextFile &read, const QString &path, const LoadText &lo
         read.problem = lost->text; // what is left of the file is not what was saved
         return TextFile::State::NotRead;
     }
-    read.problem = loading == TextLoading::NoMemory ? noMemory() : QString();
+    read.problem = loading == TextLoading::NoMemory ? noMemoryText() : QString();
     return stateOf(loading);
 }
 
@@ -65,7 +61,7 @@ TextFile readNow(const QString &path, const LoadText &load, AsideState &state)
         read.text.reset();
     }
     if (!isDone) {
-        doneWhileMemoryLasts([&read] { read.problem = noMemory(); });
+        doneWhileMemoryLasts([&read] { read.problem = noMemoryText(); });
     }
     return read;
 }

@@ -48,6 +48,9 @@ ExitStatus usageExit(const QString &text)
 
 std::unique_ptr<QCoreApplication> startQt(int &argc, char **argv, bool withFonts)
 {
+    if (QCoreApplication::instance() != nullptr) {
+        return nullptr;
+    }
     // What Qt reports about its surroundings (no session, no screen) does not matter to a person who renders a report.
     qInstallMessageHandler([](QtMsgType type, const QMessageLogContext &, const QString &text) {
         if (type == QtCriticalMsg || type == QtFatalMsg) {

@@ -23,6 +23,7 @@ std::optional<QString> applySets(JsonSource &source, const QStringList &sets);
 ExitStatus usageExit(const QString &text);
 
 /// Starts Qt without a screen and catches interrupts. @param withFonts  whether fonts are needed: most jobs do without
+/// @return null, with nothing done, where the process has an application already
 std::unique_ptr<QCoreApplication> startQt(int &argc, char **argv, bool withFonts);
 
 } // namespace kareport

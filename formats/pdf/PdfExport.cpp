@@ -2,10 +2,12 @@
 
 #include "CharacterCells.h"
 #include "LineBreaker.h"
+#include "MemoryLasts.h"
 #include "PdfDocument.h"
 #include "PdfText.h"
 #include "PdfTypesetter.h"
 #include "ReportPages.h"
+#include "StandardText.h"
 #include "Xlate.h"
 
 #include <algorithm>
@@ -198,7 +200,12 @@ template <typename Text>
 bool writeText(QIODevice &device, Text text, const PdfOptions &options, PdfNotes *notes)
 {
     PdfNotes own;
-    return PdfExport<Text>(text, options, notes != nullptr ? *notes : own).write(device);
+    PdfNotes &said = notes != nullptr ? *notes : own;
+    bool isWritten = false;
+    if (!doneWhileMemoryLasts([&] { isWritten = PdfExport<Text>(text, options, said).write(device); })) {
+        said.problem = noMemoryText();
+    }
+    return isWritten;
 }
 
 } // namespace

@@ -32,7 +32,7 @@ struct PdfOptions
 /// longer pages continue on further sheets. The same text gives the same bytes. Tabs lead to every eighth cell; other control
 /// characters are not shown.
 /// @param notes  receives what is missing or went wrong; may be null
-/// @return false when the page has not been measured, no face can be used, the library fails, or a write fails
+/// @return false when the page has not been measured, no face can be used, the library fails, memory ends, or a write fails
 bool writePdf(QIODevice &device, QStringView text, const PdfOptions &options, PdfNotes *notes = nullptr);
 bool writePdf(QIODevice &device, QLatin1StringView text, const PdfOptions &options, PdfNotes *notes = nullptr);
 

@@ -1,5 +1,7 @@
 #include "ReportTextCodec.h"
 
+#include "MemoryLasts.h"
+
 #include <QChar>
 
 #include <array>
@@ -146,16 +148,28 @@ std::size_t ReportTextEncoder::encodeCharacters(const Character *at, const Chara
     return static_cast<std::size_t>(out - begin);
 }
 
+namespace
+{
+
+template <typename Text>
+bool writeWhole(QIODevice &device, Text text, LineEnds lineEnds)
+{
+    return whileMemoryLasts(false, [&] {
+        ReportTextWriter writer(device, lineEnds);
+        return writer.write(text) && writer.finish();
+    });
+}
+
+} // namespace
+
 bool writeReportText(QIODevice &device, QStringView text, LineEnds lineEnds)
 {
-    ReportTextWriter writer(device, lineEnds);
-    return writer.write(text) && writer.finish();
+    return writeWhole(device, text, lineEnds);
 }
 
 bool writeReportText(QIODevice &device, QLatin1StringView text, LineEnds lineEnds)
 {
-    ReportTextWriter writer(device, lineEnds);
-    return writer.write(text) && writer.finish();
+    return writeWhole(device, text, lineEnds);
 }
 
 } // namespace kareport

@@ -38,7 +38,8 @@ private:
 /// The bytes that a report file begins with: the UTF-8 byte-order mark.
 inline constexpr char reportFileMark[] = {'\xEF', '\xBB', '\xBF'};
 
-/// Writes report text to an open device, a piece at a time. @return false as soon as a write fails
+/// Writes report text to an open device, a piece at a time.
+/// @return false as soon as a write fails or memory ends
 bool writeReportText(QIODevice &device, QStringView text, LineEnds lineEnds);
 bool writeReportText(QIODevice &device, QLatin1StringView text, LineEnds lineEnds);
 

@@ -1,6 +1,8 @@
 #include "RichTextReader.h"
 
+#include "MemoryLasts.h"
 #include "RichTextParser.h"
+#include "StandardText.h"
 #include "Xlate.h"
 
 #include <QStringEncoder>
@@ -98,7 +100,11 @@ std::optional<RichTextError> readRichText(QByteArrayView bytes, QTextDocument &d
 
 std::optional<RichTextError> readRichTextCharacters(QByteArrayView bytes, QString &text, RichTextNotes *notes)
 {
-    return readBytes(bytes, RichTextRawBytes::CodePage, text, notes);
+    std::optional<RichTextError> error;
+    if (!doneWhileMemoryLasts([&] { error = readBytes(bytes, RichTextRawBytes::CodePage, text, notes); })) {
+        error = RichTextError{{}, noMemoryText()};
+    }
+    return error;
 }
 
 std::optional<RichTextError> readRichText(QStringView text, QTextDocument &document, RichTextNotes *notes)

@@ -53,7 +53,8 @@ QByteArrayView richTextIn(QByteArrayView bytes);
 /// @return what is wrong, the document then holds what was read up to there; nothing where all was read
 std::optional<RichTextError> readRichText(QByteArrayView bytes, QTextDocument &document,
                                           RichTextNotes *notes = nullptr);
-/// Reads the characters alone, as the document's `toRawText` has them: several times faster.
+/// Reads the characters alone, as the document's `toRawText` has them: several times faster. That memory has ended is an
+/// error as well.
 std::optional<RichTextError> readRichTextCharacters(QByteArrayView bytes, QString &text,
                                                     RichTextNotes *notes = nullptr);
 /// Reads into a document a rich text in memory, in which characters from U+0080 on stand for themselves.

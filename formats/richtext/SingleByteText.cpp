@@ -1,5 +1,7 @@
 #include "SingleByteText.h"
 
+#include "MemoryLasts.h"
+
 #include <QByteArray>
 #include <QChar>
 #include <QIODevice>
@@ -12,9 +14,7 @@ namespace
 
 constexpr qsizetype pieceSize = 64 * 1024;
 
-} // namespace
-
-bool writeSingleByteText(QIODevice &device, QStringView text, WideCharacters wide)
+bool writeBytes(QIODevice &device, QStringView text, WideCharacters wide)
 {
     QByteArray bytes;
     bytes.reserve(pieceSize + 16);
@@ -42,6 +42,13 @@ bool writeSingleByteText(QIODevice &device, QStringView text, WideCharacters wid
         }
     }
     return device.write(bytes) == bytes.size();
+}
+
+} // namespace
+
+bool writeSingleByteText(QIODevice &device, QStringView text, WideCharacters wide)
+{
+    return whileMemoryLasts(false, [&] { return writeBytes(device, text, wide); });
 }
 
 } // namespace kareport

@@ -15,7 +15,7 @@ enum class WideCharacters
 };
 
 /// Writes a text to an open device with one byte a character up to U+00FF, and each LF as CR LF.
-/// @return false as soon as a write fails
+/// @return false as soon as a write fails or memory ends
 bool writeSingleByteText(QIODevice &device, QStringView text, WideCharacters wide);
 
 } // namespace kareport

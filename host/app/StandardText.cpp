@@ -1,5 +1,6 @@
 #include "StandardText.h"
 
+#include "MemoryLasts.h"
 #include "Xlate.h"
 
 namespace kareport
@@ -12,6 +13,11 @@ QString standardText(unsigned number)
     case fileTooLarge: return Xlate("The file is too large to open.");
     default: return QString();
     }
+}
+
+QString noMemoryText()
+{
+    return whileMemoryLasts(QString(), [] { return Xlate("there is not enough memory for it"); });
 }
 
 } // namespace kareport

@@ -3,6 +3,7 @@
 #include <cerrno>
 #include <cstddef>
 #include <fcntl.h>
+#include <sys/stat.h>
 #include <sys/syscall.h>
 #include <unistd.h>
 
@@ -25,10 +26,11 @@ bool refuses(Call call, int error)
     return true;
 }
 
-/// What the test itself prints is always written.
+/// What the test itself prints is always written, and so is what wakes an event loop.
 bool isFile(int descriptor)
 {
-    return descriptor > STDERR_FILENO;
+    struct stat status = {};
+    return descriptor > STDERR_FILENO && ::fstat(descriptor, &status) == 0 && S_ISREG(status.st_mode);
 }
 
 } // namespace

@@ -1,8 +1,9 @@
-#include "ReportSubject.h"
+#include "ReportAllocations.h"
 
 #include "FrameFixture.h"
 #include "ReportInitialTemplate.h"
 #include "ReportPages.h"
+#include "ReportSurroundings.h"
 #include "ReportTextCodec.h"
 #include "UArchive.h"
 #include "UXmlReportTpl.h"
@@ -13,28 +14,7 @@
 namespace
 {
 
-/// What becomes of the text when memory ends in an operation.
-enum class Text
-{
-    Same,     ///< it stays
-    Written,  ///< it stays, with a part of what was to be written after it; what is missing is known
-    Replaced, ///< it stays or is edited, nothing between
-    Set       ///< it is the new one, or empty and lost
-};
-
-struct Operation
-{
-    const char *name;
-    Text text;
-    bool (*act)(ReportSubject &subject, const Surroundings &around); ///< whether it says that all was done
-    Shape shape;
-    bool isSave = false; ///< to s.rep or s.rtf
-};
-
-bool lostNothing(const ReportSubject &s)
-{
-    return !s.report.HasLostText();
-}
+using Text = ReportOperation::Text;
 
 const QString line = QStringLiteral("a line that is long enough to need memory of its own");
 const QString wideLine = QStringLiteral("a line with \u6E2C in it");
@@ -44,9 +24,10 @@ const QString blocks(70000, u'x');
 // - `SetPageSize` on a printer, and with it the making of a report where there is one: Qt's fonts are measured with fontconfig,
 //   which does not look whether it got what it asked for, and Qt 6.4's own list of names, made of its members, does not
 //   either.
-// - `WritePdf` and saving as ".pdf": the faces of the document are looked for with fontconfig.
+// - `WritePdf` and saving as ".pdf" here: the faces of the document are looked for with fontconfig. PdfAllocations lets fail
+//   what it does not ask for.
 // - Rich text that is shown or read: QTextDocument and what lays it out.
-constexpr Operation operations[] = {
+constexpr ReportOperation operations[] = {
     {"Write", Text::Written, [](auto &s, auto &) { return s.report.Write(line, 0); }},
     {"Write, UTF-16", Text::Written, [](auto &s, auto &) { return s.report.Write(wideLine, 1); }},
     {"Write, a block", Text::Written, [](auto &s, auto &) { return s.report.Write(blocks, 1); }},
@@ -188,6 +169,11 @@ constexpr Operation operations[] = {
          return s.report.LoadTemplateFile(around.templatePath, QStringLiteral("T"), QStringLiteral("Points"),
                                           QStringLiteral("Site"));
      }},
+    {"SetSurroundings", Text::Same,
+     [](auto &s, auto &) {
+         s.report.SetSurroundings(kareport::ReportSurroundings());
+         return true;
+     }},
     {"LoadTemplateTable",
      Text::Same,
      [](auto &s, auto &) { return s.report.LoadTemplateTable(QStringLiteral("Points")); },
@@ -280,154 +266,9 @@ constexpr Operation operations[] = {
      }},
 };
 
-/// What an operation leaves of a report.
-struct Result
-{
-    QString text;
-    QString answer;
-    QByteArray bytes;
-};
-
-Result resultOf(const ReportSubject &subject)
-{
-    return {subject.report.CopyText(), subject.answer, subject.bytes.data()};
-}
-
-class ReportAllocations : public testing::TestWithParam<Operation>
-{
-protected:
-    ReportAllocations() { putFile(around_.loadPath, "\xEF\xBB\xBFTALVEN of a file\r\r\nline\r\r\n"); }
-
-    /// Does the operation with a request for memory failing. @return whether it failed
-    bool attempt(const Shape &shape, qint64 number, const Result &whole)
-    {
-        ReportSubject subject(shape);
-        UReportDoc &report = subject.report;
-        const QString before = report.CopyText();
-        putFile(around_.reportPath, "earlier");
-        putFile(around_.richTextPath, "earlier");
-        around_.launches.all.clear();
-        bool isDone = false;
-        bool hasFailed = false;
-        try {
-            const FailingAllocation failing(number);
-            isDone = GetParam().act(subject, around_);
-            hasFailed = failing.hasFailed();
-        } catch (...) {
-            ADD_FAILURE() << "allocation " << number << ": an exception comes out";
-            return true;
-        }
-        if (hasFailed) {
-            SCOPED_TRACE(testing::Message() << "allocation " << number << (shape.isRichText ? ", rich text" : "")
-                                            << (shape.hasWindow ? ", a window" : ""));
-            const Result result = resultOf(subject);
-            if (isDone) {
-                EXPECT_TRUE(result.text == whole.text) << "it says that all is done: " << result.text.toStdString();
-                EXPECT_TRUE(result.answer == whole.answer) << result.answer.toStdString();
-                EXPECT_TRUE(result.bytes == whole.bytes) << result.bytes.toStdString();
-            }
-            checkText(report, before, whole.text, isDone);
-            if (GetParam().isSave) {
-                const bool isEarlier =
-                    contentOf(around_.reportPath) == "earlier" && contentOf(around_.richTextPath) == "earlier";
-                EXPECT_EQ(isEarlier, !isDone) << "the file is not what the answer says";
-            }
-            checkUsable(report);
-        }
-        closeConverted();
-        return hasFailed && !HasFailure();
-    }
-
-    static void checkText(const UReportDoc &report, const QString &before, const QString &whole, bool isDone)
-    {
-        const QString text = report.CopyText();
-        switch (GetParam().text) {
-        case Text::Same: EXPECT_TRUE(text == before) << text.toStdString(); break;
-        case Text::Written:
-            EXPECT_TRUE(text.startsWith(before)) << text.toStdString();
-            EXPECT_TRUE(isDone || text == before || report.HasLostText()) << "half of it, and nobody knows";
-            break;
-        case Text::Replaced: EXPECT_TRUE(isDone || text == before) << text.toStdString(); break;
-        case Text::Set:
-            EXPECT_TRUE(isDone ? text == whole : text.isEmpty()) << text.toStdString();
-            EXPECT_EQ(report.HasLostText(), !isDone);
-            break;
-        }
-    }
-
-    void checkUsable(UReportDoc &report)
-    {
-        const QString text = report.CopyText();
-        EXPECT_TRUE(report.Write(QStringLiteral("after"), 0));
-        EXPECT_TRUE(report.CopyText() == text + QStringLiteral("after"));
-        if (report.HasLostText()) {
-            EXPECT_EQ(report.LoadFile(around_.loadPath, false), 1) << "that file is there as a whole";
-            putFile(around_.reportPath, "earlier");
-            EXPECT_FALSE(report.OnSaveDocument(around_.reportPath)) << "half a report is saved";
-            EXPECT_EQ(contentOf(around_.reportPath), "earlier");
-        }
-        report.Clear();
-        EXPECT_TRUE(report.IsEmpty());
-        EXPECT_FALSE(report.HasLostText());
-    }
-
-    void closeConverted()
-    {
-        const auto &documents = around_.application.reportTemplate()->GetDocuments();
-        while (!documents.empty()) {
-            documents.back()->SetAutoDelete(true);
-            documents.back()->OnCloseDocument();
-        }
-    }
-
-    Surroundings around_;
-};
-
 TEST_P(ReportAllocations, AnyOfThemMayFail)
 {
-    const bool usesEditor = std::string(GetParam().name).find("ditor") != std::string::npos ||
-                            std::string(GetParam().name).find("Word") != std::string::npos;
-    SetUsePreferredReportEditorFlag(usesEditor);
-    for (const auto &[isRichText, hasWindow] :
-         {std::pair(false, false), std::pair(true, false), std::pair(false, true), std::pair(true, true)})
-    {
-        Shape shape = GetParam().shape;
-        shape.isRichText = isRichText;
-        shape.hasWindow = hasWindow;
-        Result whole;
-        {
-            // Once as it should be; what is made only once in a program is made then.
-            ReportSubject subject(shape);
-            around_.launches.all.clear();
-            ASSERT_TRUE(GetParam().act(subject, around_)) << "it does not work at all";
-            whole = resultOf(subject);
-            closeConverted();
-        }
-        failingEachAllocation([&](qint64 number) { return attempt(shape, number, whole); });
-        if (HasFailure()) {
-            return;
-        }
-    }
-}
-
-std::string nameOf(const testing::TestParamInfo<Operation> &info)
-{
-    std::string name;
-    bool isNext = false;
-    for (const char letter : std::string(info.param.name)) {
-        if (std::isalnum(static_cast<unsigned char>(letter)) == 0) {
-            isNext = true;
-            continue;
-        }
-        name += isNext ? static_cast<char>(std::toupper(static_cast<unsigned char>(letter))) : letter;
-        isNext = false;
-    }
-    return name;
-}
-
-void PrintTo(const Operation &operation, std::ostream *out)
-{
-    *out << operation.name;
+    tryAll();
 }
 
 INSTANTIATE_TEST_SUITE_P(Operations, ReportAllocations, testing::ValuesIn(operations), nameOf);

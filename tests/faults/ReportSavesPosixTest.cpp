@@ -1,6 +1,7 @@
-#include "FailingFiles.h"
+#include "FailEachCall.h"
 
 #include "CommandLineJob.h"
+#include "Commands.h"
 #include "FrameFixture.h"
 #include "JobOutputs.h"
 #include "JobRunnerFixture.h"
@@ -14,55 +15,6 @@
 
 namespace
 {
-
-using Call = FailingFiles::Call;
-
-constexpr Call calls[] = {Call::Write, Call::ShortWrite, Call::Flush, Call::Rename};
-constexpr const char *callNames[] = {"write", "short write", "flush", "rename"};
-
-/// Lets a save fail at each of its calls in turn.
-/// @param prepare  is called before each
-/// @param save     saves over a file that holds "earlier". @return whether it says that it did
-/// @param failed   is called after each that has failed
-template <typename Prepare, typename Save, typename Failed>
-void failEachCall(const QString &path, Prepare prepare, Save save, Failed failed)
-{
-    QString folder = QFileInfo(path).absolutePath();
-    for (const Call call : calls) {
-        // A second wait for the same bytes, which Qt adds, fails on no disk: they are there.
-        const qint64 last = call == Call::Flush ? 1 : 1000;
-        qint64 number = 1;
-        for (bool hasFailed = true; hasFailed && number <= last; ++number) {
-            SCOPED_TRACE(std::string(callNames[static_cast<int>(call)]) + " " + std::to_string(number));
-            putFile(path, "earlier");
-            const auto names = QDir(folder).entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot);
-            prepare();
-            bool isSaved = false;
-            {
-                const FailingFiles failing(call, number);
-                isSaved = save();
-                hasFailed = failing.hasFailed();
-            }
-            EXPECT_EQ(isSaved, !hasFailed);
-            EXPECT_EQ(contentOf(path) == "earlier", hasFailed) << "the earlier file is whole, or the new one is there";
-            EXPECT_EQ(QDir(folder).entryList(QDir::AllEntries | QDir::Hidden | QDir::NoDotAndDotDot), names)
-                << "nothing is left beside it";
-            if (hasFailed) {
-                failed();
-            }
-            if (testing::Test::HasFailure()) {
-                return;
-            }
-        }
-        EXPECT_GT(number, call == Call::Flush ? 1 : 2) << callNames[static_cast<int>(call)] << ": it is never called";
-    }
-}
-
-QString longText()
-{
-    // More than is buffered at once.
-    return reportLines(QStringLiteral("a line of a report \u6E2C\n").repeated(10000));
-}
 
 TEST(ReportSaves, WhenTheSystemFailsTheEarlierFileIsWholeAndTheReportIsStillModified)
 {
@@ -99,15 +51,23 @@ TEST(ReportSaves, WhenTheSystemFailsTheEarlierFileIsWholeAndTheReportIsStillModi
 TEST(ReportSaves, SaveFileGoesOnEitherWay)
 {
     const QTemporaryDir folder;
-    const QString path = folder.filePath(QStringLiteral("a.rep"));
     ShownReport shown(longText());
-    putFile(path, "earlier");
-    shown.report.SetModifiedFlag(true);
-    const FailingFiles failing(Call::Write, 1);
-    EXPECT_EQ(shown.report.SaveFile(path), 1);
-    EXPECT_TRUE(failing.hasFailed());
-    EXPECT_EQ(contentOf(path), "earlier");
-    EXPECT_TRUE(shown.report.IsModified());
+    shown.open();
+    shown.report.SetPageSize();
+    for (const char *name : {"a.rep", "a.rtf", "a.pdf"}) {
+        SCOPED_TRACE(name);
+        const QString path = folder.filePath(QString::fromUtf8(name));
+        failEachCall(
+            path, [&] { shown.report.SetModifiedFlag(true); },
+            [&] {
+                EXPECT_EQ(shown.report.SaveFile(path), 1);
+                return shown.report.GetSaveProblem().isEmpty();
+            },
+            [&] {
+                EXPECT_TRUE(shown.report.IsModified());
+                EXPECT_EQ(shown.report.GetTextLength(), longText().size());
+            });
+    }
 }
 
 TEST(ReportSaves, AnOutputOfTheCommandLineIsWholeOrNotWritten)
@@ -152,7 +112,7 @@ TEST(ReportSaves, AFullDiskIsSaidInTheSystemsWords)
     ShownReport shown(longText());
     shown.report.SetPageSize();
     for (const OutputKind kind : {OutputKind::Report, OutputKind::Text, OutputKind::RichText, OutputKind::Pdf}) {
-        const FailingFiles failing(Call::Write, 1);
+        const FailingFiles failing(FailingFiles::Call::Write, 1);
         kareport::Progress progress(false);
         const auto result = kareport::writeOutput(shown.report, {folder.filePath(QStringLiteral("a")), kind}, progress);
         EXPECT_TRUE(failing.hasFailed());
@@ -168,7 +128,7 @@ TEST(ReportSaves, AFileThatCannotTakeItsPlaceIsSaidInTheSystemsWords)
     const ShownReport shown(longText());
     putFile(path, "earlier");
     QString problem;
-    const FailingFiles failing(Call::Rename, 1);
+    const FailingFiles failing(FailingFiles::Call::Rename, 1);
     EXPECT_FALSE(kareport::replaceFile(
         path, [&shown](QIODevice &device) { return shown.report.WriteText(device, kareport::LineEnds::ReportFile); },
         &problem));
@@ -201,6 +161,27 @@ TEST(ReportSaves, AJobThatGoesStraightToItsFileIsWholeOrNotWritten)
                 return job.run(progress) == kareport::exitDone;
             },
             [] {});
+    }
+}
+
+TEST(ReportSaves, AConvertedReportIsWholeOrNotWritten)
+{
+    const FixedSurroundings surroundings;
+    const JobFolder folder;
+    folder.put("in.rep", "\xEF\xBB\xBF" + QByteArray("a line of a report\r\r\n").repeated(5000));
+    folder.put("in.rtf", "{\\rtf1 " + QByteArray("a line of a report\\par\r\n").repeated(5000) + '}');
+    for (const char *in : {"in.rep", "in.rtf"}) {
+        for (const char *out : {"a.rep", "a.txt", "a.rtf", "a.pdf"}) {
+            SCOPED_TRACE(std::string(in) + " to " + out);
+            kareport::ConvertCommand command;
+            command.input = folder.path(in);
+            command.output = folder.path(out);
+            command.quiet = true;
+            int count = 0;
+            failEachCall(
+                command.output, [] {}, [&] { return command.run(count, nullptr) == kareport::exitDone; },
+                [&] { EXPECT_EQ(command.run(count, nullptr), kareport::exitDone) << "another try"; });
+        }
     }
 }
 

@@ -3,6 +3,7 @@
 #include "DataReport.h"
 #include "EditorFixture.h"
 #include "FailingAllocation.h"
+#include "LoadedText.h"
 #include "ReportWindowFixture.h"
 #include "TemporaryFolder.h"
 #include "UDataObjectList.h"
@@ -11,6 +12,7 @@
 #include <QBuffer>
 
 #include <memory>
+#include <vector>
 
 /// What all reports of these tests share: files, an editor that is only recorded, an application.
 class Surroundings
@@ -38,6 +40,7 @@ public:
     const AnsweredBoxes boxes{MessageAnswer::No};
     const QString templatePath = folders_.libraryPath() + QStringLiteral("/t.xml");
     const QString loadPath = folder_.at(QStringLiteral("a.rep"));
+    const QString richTextLoadPath = folder_.at(QStringLiteral("a.rtf"));
     const QString reportPath = folder_.at(QStringLiteral("s.rep"));
     const QString richTextPath = folder_.at(QStringLiteral("s.rtf"));
     ReportApplication application;
@@ -85,11 +88,13 @@ public:
         }
         report.WriteLine(QStringLiteral("before"), 0, 1, 0);
         report.SetHeading(QStringLiteral("Heading"), 1, 1);
+        loaded.text.append(QStringView(u"taken over\r\n"));
+        loaded.lineEnds = 1;
         bytes.open(QIODevice::ReadWrite);
     }
     ~ReportSubject()
     {
-        if (pane_ != nullptr) {
+        if (pane_ != nullptr && CViewPane::IsOpen(pane_)) {
             pane_->ClosePane();
         }
     }
@@ -100,6 +105,8 @@ public:
     UDataObjectList list;
     QString answer; ///< what an operation gives back
     QBuffer bytes;
+    kareport::LoadedText loaded;      ///< that the report can take over
+    std::vector<qint64> starts{0, 4}; ///< of pages
 
 private:
     TestReportWindow *window_ = nullptr; ///< the report's
