@@ -168,6 +168,16 @@ void runJob(World &world, Chance &chance)
     world.frame().OpenFile(world.files().filePath(world.did));
 }
 
+void openLong(World &world, Chance & /*chance*/)
+{
+    world.openLong();
+}
+
+void reopen(World &world, Chance &chance)
+{
+    world.reopen(chance);
+}
+
 void dropFile(World &world, Chance &chance)
 {
     const QStringList names = world.files().entryList(QDir::Files);
@@ -385,6 +395,8 @@ const std::vector<Action> &allActions()
         {"new-window", 3, false, newWindow},
         {"open", 5, false, openFile},
         {"job", 6, false, runJob},
+        {"open-long", 1, false, openLong},
+        {"reopen", 3, false, reopen},
         {"drop", 2, false, dropFile},
         {"tab", 8, false, clickTab},
         {"click", 6, false, clickText},

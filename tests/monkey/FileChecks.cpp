@@ -1,5 +1,7 @@
 #include "World.h"
 
+#include "DeskFrame.h"
+#include "PageHeader.h"
 #include "ReportTextDecoder.h"
 #include "RichTextReader.h"
 #include "UReportDoc.h"
@@ -97,17 +99,123 @@ QString World::describeWritten(const QString &text) const
     return described;
 }
 
-QString World::checkFiles() const
+QString World::checkSaved(const UReportDoc &report, const Seen &was)
+{
+    const QString text = textOf(report);
+    const QString path = report.GetPathName();
+    const bool isSaved = was.isModified && !report.IsModified();
+    // Under another name, also where there was nothing to save.
+    const bool isSavedAs = path != was.path && !path.isEmpty() && !report.IsModified();
+    if ((!isSaved && !isSavedAs) || text.isEmpty()) {
+        return {};
+    }
+    if (isSaved && !isKept(text)) {
+        return QStringLiteral("%1 counts as saved and is in no file").arg(was.title) + describeWritten(text);
+    }
+    if (isSavedAs && !loadsAs(path, text)) {
+        return QStringLiteral("%1 is not what it was saved as, %2").arg(was.title, path) + describeWritten(text);
+    }
+    if (path.endsWith(u".rep") && !isRich(report)) {
+        saved_.insert(was.id, {path, lookAtFiles().value(path)});
+    }
+    return {};
+}
+
+QString World::checkFiles()
 {
     for (const UReportDoc *report : reports()) {
         const Seen *was = seen(ids_.value(report));
-        const bool isSaved = was != nullptr && was->isModified && !report->IsModified() && !isReloaded(*was);
-        const QString text = textOf(*report);
-        if (isSaved && !text.isEmpty() && !isKept(text)) {
-            return QStringLiteral("%1 counts as saved and is in no file").arg(was->title) + describeWritten(text);
+        if (was == nullptr || isReloaded(*was)) {
+            continue;
+        }
+        if (const QString wrong = checkSaved(*report, *was); !wrong.isEmpty()) {
+            return wrong;
         }
     }
     return {};
+}
+
+std::vector<UReportDoc *> World::savedReports() const
+{
+    const QHash<QString, Stamp> files = lookAtFiles();
+    std::vector<UReportDoc *> found;
+    for (UReportDoc *report : reports()) {
+        const Saved saved = saved_.value(ids_.value(report));
+        if (!report->IsModified() && !report->IsEmpty() && !isRich(*report) && saved.stamp.size >= 0 &&
+            report->GetPathName() == saved.path && files.value(saved.path) == saved.stamp)
+        {
+            found.push_back(report);
+        }
+    }
+    return found;
+}
+
+void World::reopen(Chance &chance)
+{
+    const std::vector<UReportDoc *> all = savedReports();
+    if (all.empty()) {
+        return;
+    }
+    const UReportDoc &report = *all[static_cast<std::size_t>(chance.below(static_cast<qsizetype>(all.size())))];
+    did = report.GetPathName();
+    QString copy;
+    for (int number = 1; copy.isEmpty() || QFile::exists(copy); ++number) {
+        copy = files().filePath(QStringLiteral("copy %1.rep").arg(number));
+    }
+    const qint64 limit = fileLimit();
+    limitFiles(-1);
+    const bool isCopied = QFile::copy(report.GetPathName(), copy);
+    limitFiles(limit);
+    // What it is compared with, as the report may be closed meanwhile.
+    const QString text = textOf(report);
+    const std::vector<qint64> starts = report.GetPageStarts();
+    const bool hasHeaders = !starts.empty() && starts.front() == 0 && kareport::pageHeadersIn(text) == starts;
+    const qsizetype pages = pagesOf(report);
+    if (!isCopied || !frame_->OpenFile(copy)) {
+        wrong_ = QStringLiteral("%1 cannot be opened again").arg(did);
+        return;
+    }
+    for (const UReportDoc *opened : reports()) {
+        if (opened->GetPathName() != copy) {
+            continue;
+        }
+        if (textOf(*opened) != text) {
+            wrong_ = QStringLiteral("%1 opened again is another text").arg(did) + describeWritten(text);
+        } else if (hasHeaders && (opened->GetPageStarts() != starts || pagesOf(*opened) != pages)) {
+            // Pages that no header line begins are in no file.
+            wrong_ =
+                QStringLiteral("%1 opened again has %2 pages and not %3").arg(did).arg(pagesOf(*opened)).arg(pages);
+        }
+        return;
+    }
+    wrong_ = QStringLiteral("%1 was opened again, and no report has it").arg(did);
+}
+
+void World::openLong()
+{
+    const QString path = files().filePath(QStringLiteral("points.rep"));
+    if (!QFile::exists(path)) {
+        constexpr int lines = 7000;
+        constexpr int linesPerPage = 60;
+        QByteArray content = "\xEF\xBB\xBF";
+        for (int line = 0; line < lines; ++line) {
+            content += line % linesPerPage == 0
+                           ? "TALVEN Survey - Points         Mar 05, 2024  02:07PM    Page:" +
+                                 QByteArray::number(line / linesPerPage + 1).rightJustified(3)
+                           : "Point " + QByteArray::number(line).rightJustified(6) + QByteArray(70, '.');
+            content += "\r\r\n";
+        }
+        const qint64 limit = fileLimit();
+        limitFiles(-1);
+        QFile file(path);
+        if (file.open(QIODevice::WriteOnly)) {
+            file.write(content);
+        }
+        file.close();
+        limitFiles(limit);
+    }
+    did = path;
+    frame_->OpenFile(path);
 }
 
 } // namespace monkey

@@ -200,15 +200,19 @@ QString World::checkPages() const
     if (steps_ % interval != 0) {
         return {};
     }
+    const auto isLookedAt = [this](const UReportDoc &report) {
+        constexpr qint64 longText = 200'000;
+        return !report.IsEmpty() && (report.GetTextLength() < longText || steps_ % (8 * interval) == 0);
+    };
     for (const UReportDoc *report : reports()) {
-        if (!report->IsEmpty()) {
+        if (isLookedAt(*report)) {
             if (const QString wrong = checkPdf(*report); !wrong.isEmpty()) {
                 return QStringLiteral("the PDF of \"%1\": ").arg(report->GetTitle()) + wrong;
             }
         }
     }
     for (UReportView *view : viewsOnScreen()) {
-        if (!view->GetDocument()->IsEmpty() && !isRich(*view->GetDocument())) {
+        if (isLookedAt(*view->GetDocument()) && !isRich(*view->GetDocument())) {
             if (const QString wrong = checkPrint(*view); !wrong.isEmpty()) {
                 return QStringLiteral("\"%1\" printed: ").arg(view->GetDocument()->GetTitle()) + wrong;
             }

@@ -131,6 +131,7 @@ void World::restart()
     application_.reset();
     settle();
     ids_.clear();
+    saved_.clear();
     before_.clear();
     application_ = std::make_unique<Application>(*this);
     frame_ = std::make_unique<DeskFrame>();
@@ -226,6 +227,7 @@ void World::note()
     mayChange.clear();
     mayReload = false;
     did.clear();
+    wrong_.clear();
 }
 
 void World::run(const Step &step)

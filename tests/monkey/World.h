@@ -82,6 +82,11 @@ public:
     QString checkRecovered();
     QString newPath(Chance &chance) const;
 
+    /// Opens what a report was saved in, as a user does with a copy of the file. What is wrong with it is found by the check.
+    void reopen(Chance &chance);
+    /// Opens a report so long that it is loaded in pieces.
+    void openLong();
+
     // What the step that runs says of itself.
     std::set<const UReportDoc *> mayChange; ///< texts that it edits
     bool mayReload = false;                 ///< files were changed by somebody else
@@ -89,6 +94,13 @@ public:
 
 private:
     class Application;
+
+    /// The file that a report was saved in, as it was then.
+    struct Saved
+    {
+        QString path;
+        Stamp stamp;
+    };
 
     const Seen *seen(quint64 id) const;
     quint64 idOf(const UReportDoc &report);
@@ -103,12 +115,17 @@ private:
     /// Whether the user let the desk load the file of a report again.
     bool isReloaded(const Seen &was) const;
     static bool isRich(const UReportDoc &report);
+    /// Whether a view that shows formats, or rich text, shows what the report holds.
+    static bool showsRich(const UReportDoc &report, const QString &shown);
+    QString checkSaved(const UReportDoc &report, const Seen &was);
+    /// The reports that stand in their files as they are now.
+    std::vector<UReportDoc *> savedReports() const;
     static QString checkPdf(const UReportDoc &report);
     QString checkPrint(UReportView &view) const;
 
     QString checkClosed() const;
     QString checkTexts() const;
-    QString checkFiles() const;
+    QString checkFiles();
     QString checkWindows();
     QString checkActive() const;
     QString checkPages() const;
@@ -124,6 +141,8 @@ private:
     std::vector<Seen> before_;
     std::vector<Seen> closed_; ///< as they were when they were closed
     QHash<QString, Stamp> filesBefore_;
+    QHash<quint64, Saved> saved_; ///< by the numbers of reports
+    QString wrong_;               ///< what the step itself has found
     std::vector<Answer> given_;
     quint64 steps_ = 0;
     bool mayBeInTabs_ = false; ///< the keyboard, which the Tab key leads to the rows of tabs

@@ -13,6 +13,7 @@
 
 #include <algorithm>
 #include <iostream>
+#include <numeric>
 
 namespace
 {
@@ -109,42 +110,52 @@ int main(int argc, char **argv)
     const QCommandLineOption secondsOption(QStringLiteral("seconds"),
                                            QStringLiteral("Goes on with the next seeds for so long."),
                                            QStringLiteral("N"), QStringLiteral("0"));
+    const QCommandLineOption runsOption(QStringLiteral("runs"), QStringLiteral("Goes on with the next seeds, so many."),
+                                        QStringLiteral("N"), QStringLiteral("1"));
     const QCommandLineOption faultsOption(QStringLiteral("faults"),
                                           QStringLiteral("Lets files, printers and editors fail as well."));
     const QCommandLineOption logOption(QStringLiteral("log"), QStringLiteral("Also writes what is found to a file."),
                                        QStringLiteral("FILE"));
-    const QCommandLineOption replayOption(QStringLiteral("replay"), QStringLiteral("Does the steps of a file."),
+    const QCommandLineOption replayOption(QStringLiteral("replay"),
+                                          QStringLiteral("Does the steps of a file, or of each of several."),
                                           QStringLiteral("FILE"));
     QCommandLineOption workerOption(QStringLiteral("worker"), QString(), QStringLiteral("DIR"));
     QCommandLineOption fromOption(QStringLiteral("from"), QString(), QStringLiteral("N"));
     workerOption.setFlags(QCommandLineOption::HiddenFromHelp);
     fromOption.setFlags(QCommandLineOption::HiddenFromHelp);
-    parser.addOptions(
-        {seedOption, stepsOption, secondsOption, faultsOption, logOption, replayOption, workerOption, fromOption});
+    parser.addOptions({seedOption, stepsOption, runsOption, secondsOption, faultsOption, logOption, replayOption,
+                       workerOption, fromOption});
     parser.process(*application);
     if (isWorker) {
         return work(parser.value(workerOption), parser.value(fromOption).toULongLong());
     }
     Supervisor supervisor(QCoreApplication::applicationFilePath(), parser.value(logOption));
     if (parser.isSet(replayOption)) {
-        return drive(supervisor, readSteps(parser.value(replayOption)), parser.value(replayOption));
+        const QStringList files = parser.values(replayOption);
+        return std::accumulate(files.begin(), files.end(), 0, [&supervisor](int status, const QString &file) {
+            return std::max(status, drive(supervisor, readSteps(file), file));
+        });
     }
     bool isSeed = false;
     bool isCount = false;
+    bool isRuns = false;
     quint64 seed = parser.value(seedOption).toULongLong(&isSeed);
     const int count = parser.value(stepsOption).toInt(&isCount);
-    if (!isSeed || !isCount || count < 1) {
-        std::cerr << "kareport-monkey: --seed and --steps are followed by numbers, as in --seed 7 --steps 300\n";
+    const int runs = parser.value(runsOption).toInt(&isRuns);
+    if (!isSeed || !isCount || !isRuns || count < 1) {
+        std::cerr
+            << "kareport-monkey: --seed, --steps and --runs are followed by numbers, as in --seed 7 --steps 300\n";
         return 2;
     }
     const qint64 milliseconds = parser.value(secondsOption).toLongLong() * 1000;
     QElapsedTimer time;
     time.start();
     int violations = 0;
+    int done = 0;
     do {
         violations +=
             drive(supervisor, makeSteps(seed, count, parser.isSet(faultsOption)), QStringLiteral("seed %1").arg(seed));
         ++seed;
-    } while (time.elapsed() < milliseconds);
+    } while (++done < runs || time.elapsed() < milliseconds);
     return violations > 0 ? 1 : 0;
 }
