@@ -77,8 +77,10 @@ std::vector<ReportStep> randomSteps(quint64 seed, bool longTexts)
         } else if (random.below(4) == 0) {
             constexpr ReportOp often[] = {ReportOp::Undo, ReportOp::Undo, ReportOp::Table, ReportOp::Rows};
             op = often[random.below(int(std::size(often)))];
-        } else if ((op == ReportOp::SetData || op == ReportOp::Clear || op == ReportOp::RichText) &&
-                   random.below(4) != 0) {
+        } else if ((op == ReportOp::SetData || op == ReportOp::Clear || op == ReportOp::RichText ||
+                    op == ReportOp::RichTextOn) &&
+                   random.below(4) != 0)
+        {
             op = ReportOp::WriteLine;
         }
         if (op == ReportOp::SetLongData && !longTexts) {

@@ -1,5 +1,10 @@
 #include "ModelledReport.h"
 
+#include "LoadedText.h"
+#include "RichTextReader.h"
+
+#include <QTextBlock>
+
 ModelledReport::ModelledReport(QString &clipboard)
     : template_(shown_.report), model_(headerOf(QStringLiteral("Title"), 0).chopped(3)), clip_(clipboard)
 {
@@ -8,13 +13,29 @@ ModelledReport::ModelledReport(QString &clipboard)
     openView(false);
 }
 
+namespace
+{
+
+/// Whether a step writes at the end of a report.
+bool writes(const ReportStep &step)
+{
+    return step.op <= ReportOp::Heading || step.op == ReportOp::Load ||
+           (step.op == ReportOp::WriteUnseen && step.b % 3 != 0);
+}
+
+} // namespace
+
 QString ModelledReport::carryOut(const ReportStep &step)
 {
     const QString textBefore = model_.text();
     const std::vector<qint64> startsBefore = model_.starts();
     const bool isUser = step.op >= ReportOp::Type && step.op <= ReportOp::TakeAll;
+    const bool wasRich = isRich_;
     editsSeen_ = 0;
     isUser ? actAsUser(step) : step.op >= ReportOp::HidePane ? actOnPanes(step) : actAsHost(step);
+    if (wasRich && isRich_ && writes(step)) {
+        image_ += model_.text().sliced(textBefore.size()); // what hosts write goes into the image as well
+    }
     QString wrong = compare();
     if (wrong.isEmpty() && step.op == ReportOp::Undo && canUndoExactly_ && editsSeen_ > 0 &&
         model_.text() == beforeEdit_ && model_.starts() != startsBeforeEdit_)
@@ -35,12 +56,12 @@ QString ModelledReport::compare()
     return wrong.isEmpty() ? compareViews(text) : wrong;
 }
 
-UReportView *ModelledReport::visibleView(int number) const
+ModelledReport::Shown *ModelledReport::visibleView(int number)
 {
-    std::vector<UReportView *> visible;
-    for (const Shown &shown : views_) {
+    std::vector<Shown *> visible;
+    for (Shown &shown : views_) {
         if (!shown.isHidden) {
-            visible.push_back(shown.view);
+            visible.push_back(&shown);
         }
     }
     return visible.empty() ? nullptr : visible[std::size_t(number) % visible.size()];
@@ -51,6 +72,7 @@ void ModelledReport::tellViews()
     report().UpdateAllViews(nullptr, 0, nullptr);
     for (Shown &shown : views_) {
         shown.isStale = false;
+        shown.isEdited = false;
     }
 }
 
@@ -152,9 +174,15 @@ void ModelledReport::actAsHost(const ReportStep &step)
     case ReportOp::Clear:
         report().Clear();
         model_.clear();
+        image_.clear();
         isModified_ = true;
         break;
-    case ReportOp::RichText: actInRichText(step); break;
+    case ReportOp::RichText: actInRichText(step); return;
+    case ReportOp::RichTextOn: switchOn(); break;
+    case ReportOp::RichTextOff: switchOff(); break;
+    case ReportOp::Load: load(step); break;
+    case ReportOp::SaveAlone: saveAlone(); return;
+    case ReportOp::SaveRichText: saveRichText(); return;
     case ReportOp::OpenView:
         if (views_.size() < 3) {
             openView(step.b % 2 == 0);
@@ -184,7 +212,10 @@ void ModelledReport::actOnPanes(const ReportStep &step)
     case ReportOp::ShowPane:
         shown.view->GetParentPane()->ShowPane(true);
         shown.view->GetWidget()->show();
-        shown.isStale = shown.isStale && !shown.isHidden; // what is shown again is loaded where it is another text
+        if (shown.isStale && shown.isHidden) {
+            shown.isStale = false; // what is shown again is loaded where it is another text
+            shown.isEdited = false;
+        }
         shown.isHidden = false;
         break;
     case ReportOp::WriteUnseen: writeUnseen(step); break;
@@ -231,7 +262,10 @@ void ModelledReport::needAll(Shown &shown, int seed)
     switch (seed % 5) {
     case 0: widgetOf(view).goToPage(1 + seed % 9); break;
     case 1: wrongAnswer_ = wrongAnswer_ || !view.streamPlainText(device); break;
-    case 2: view.UpdateData(true); break;
+    case 2:
+        view.UpdateData(true);
+        shown.isEdited = false;
+        break;
     case 3:
         widgetOf(view).openPageBar();
         QTest::keyClick(&view.GetEdit(), Qt::Key_Escape);
@@ -263,6 +297,7 @@ void ModelledReport::reload()
     report().SetPathName(path, false);
     wrongAnswer_ = wrongAnswer_ || !report().OnSaveDocument(path) || report().IsModified() ||
                    !kareport::reloadSavedReport(report());
+    isRich_ = false;
     model_.reload(text);
     model_.setLinesPerPage(report().GetLinesPerPage());
     isModified_ = false;
@@ -275,51 +310,178 @@ bool ModelledReport::isAllCrLf() const
            text.count(u'\r') == text.count(QStringLiteral("\r\n"));
 }
 
-void ModelledReport::actInRichText(const ReportStep &step)
+void ModelledReport::load(const ReportStep &step)
 {
-    if (visibleView(step.b) == nullptr) {
+    static const QStringList lines = {QStringLiteral("loaded"), QString(), QStringLiteral("1.5  x"),
+                                      headerOf(QStringLiteral("Loaded"), 3)};
+    const bool keepsEnds = step.a % 2 == 0;
+    QStringList chosen;
+    for (int i = 0; i <= step.b % 25; ++i) {
+        chosen.append(lines[(step.c / (i + 1) + i) % lines.size()]);
+    }
+    const QString path = folder_.filePath(QStringLiteral("loaded.rep"));
+    putFile(path, chosen.join(QStringLiteral("\r\n")).toLatin1() + "\r\n");
+    wrongAnswer_ = wrongAnswer_ || report().LoadFile(path, keepsEnds) != 1;
+    model_.load(chosen, keepsEnds);
+    isModified_ = true;
+}
+
+void ModelledReport::saveAlone()
+{
+    const QString path = folder_.filePath(QStringLiteral("alone.rep"));
+    const QString text = model_.text();
+    wrongAnswer_ = wrongAnswer_ || !report().OnSaveDocument(path);
+    isModified_ = false;
+    if (text.isEmpty() || (text.contains(u'\n') && !text.contains(QStringLiteral("\r\n")))) {
+        return; // there is no file, or one that reads as that of an editor
+    }
+    QFile file(path);
+    kareport::LoadedText saved;
+    const bool isRead = file.open(QIODevice::ReadOnly) &&
+                        kareport::loadReportText(file.readAll(), saved) == kareport::TextLoading::Whole;
+    if (!isRead || saved.text.piece(0, saved.text.size()) != text || saved.pageStarts != ReportModel::headersIn(text)) {
+        wrongSave_ = QStringLiteral("saved alone: ") + brief(saved.text.piece(0, saved.text.size()));
+    }
+}
+
+namespace
+{
+
+/// A text without its line ends and blanks: an image of it has fewer of the first, and more of the others.
+QString inkOf(QString text)
+{
+    return text.remove(u'\r').remove(u'\n').remove(u' ');
+}
+
+/// The lines of a text, without the empty ones at its end.
+QString linesOf(QString text)
+{
+    text.replace(QStringLiteral("\r\n"), QStringLiteral("\n"));
+    while (text.endsWith(u'\n')) {
+        text.chop(1);
+    }
+    return text;
+}
+
+} // namespace
+
+void ModelledReport::saveRichText()
+{
+    constexpr qint64 longestSaved = 100'000; // characters
+    if (model_.size() == 0 || model_.size() > longestSaved) {
         return;
     }
+    const QString path = folder_.filePath(QStringLiteral("alone.rtf"));
+    wrongAnswer_ = wrongAnswer_ || !report().OnSaveDocument(path);
+    for (Shown &shown : views_) { // which were updated for it
+        shown.isStale = false;
+        shown.isEdited = false;
+    }
+    QFile file(path);
+    QTextDocument saved;
+    const bool isRead =
+        file.open(QIODevice::ReadOnly) && !kareport::readRichText(QByteArrayView(file.readAll()), saved);
+    const QString lines = linesOf(saved.toPlainText());
+    if (!isRead || (isRich_ ? inkOf(lines) != inkOf(image_) : lines != linesOf(model_.text()))) {
+        wrongSave_ = QStringLiteral("saved as rich text: ") + brief(lines);
+    }
+}
+
+void ModelledReport::switchOn()
+{
     report().Clear();
     model_.clear();
+    image_.clear();
     report().SetRTFDataFlag(true);
+    isRich_ = true;
+    isModified_ = true;
+}
+
+void ModelledReport::switchOff()
+{
+    report().SetRTFDataFlag(false);
+    isRich_ = false;
+}
+
+void ModelledReport::actInRichText(const ReportStep &step)
+{
+    Shown *shown = visibleView(step.b);
+    if (shown == nullptr) {
+        return;
+    }
+    switchOn();
     for (int i = 0; i < step.a % 20; ++i) {
         report().WriteLine(line(1 + i % 3), 0, 1, i % 4);
         model_.writeLine(line(1 + i % 3), 0, 1);
     }
-    report().UpdateAllViews(nullptr, 0, nullptr);
-    kareport::ReportEdit &edit = visibleView(step.b)->GetEdit();
-    putCursor(edit, step.c % std::max(1, edit.document()->characterCount()));
-    QTest::keyClick(&edit, step.c % 2 == 0 ? Qt::Key_X : Qt::Key_Return);
-    report().SetRTFDataFlag(false);
-    // The image ends its last paragraph without a line end of its own: the text is the control's.
-    followText(edit);
-    isModified_ = true;
+    image_ = model_.text();
+    tellViews();
+    typeIntoImage(*shown, step);
+    switchOff();
+    tellViews();
 }
 
-void ModelledReport::followText(kareport::ReportEdit &edit)
+void ModelledReport::typeIntoImage(Shown &shown, const ReportStep &step)
 {
-    const std::vector<qint64> starts = report().GetPageStarts();
-    model_.setData(edit.windowText());
-    if (starts != model_.starts()) {
-        model_.adoptStarts(starts);
+    kareport::ReportEdit &edit = shown.view->GetEdit();
+    const QString text = model_.text();
+    const int blocks = edit.document()->blockCount();
+    putCursor(edit, placeIn(edit.document()->characterCount(), step.c));
+    const QTextCursor cursor = edit.textCursor();
+    const int line = cursor.blockNumber();
+    const bool endsLine = step.c % 2 != 0;
+    const bool isPutBefore = endsLine && cursor.atBlockStart() && cursor.position() > 0;
+    // Where the lines of the text are those of the image, pages go on beginning with the lines that they began with.
+    const auto ends = text.count(u'\n');
+    const bool areLines = ends + 1 == blocks || (ends == blocks && text.endsWith(u'\n'));
+    const bool isSame = edit.windowText() == asShown(text);
+    std::vector<int> lines;
+    for (const qint64 start : model_.starts()) {
+        const auto number = static_cast<int>(QStringView(text).first(start).count(u'\n'));
+        const bool begins = start == 0 || text[start - 1] == u'\n';
+        if (begins && start < text.size() && number < blocks) {
+            lines.push_back(number + (endsLine && (number > line || (number == line && isPutBefore)) ? 1 : 0));
+        }
     }
+    EditSpy spy(edit);
+    QTest::keyClick(&edit, endsLine ? Qt::Key_Return : Qt::Key_X);
+    isModified_ = true;
+    for (Shown &other : views_) {
+        other.isStale = false;
+        other.isEdited = &other == &shown;
+    }
+    if (isSame) {
+        model_.withCrLf();
+        for (const SeenEdit &seen : spy.edits) {
+            model_.replace(seen.at, seen.removed, seen.inserted);
+        }
+        return;
+    }
+    std::vector<qint64> starts;
+    for (const int number : lines) {
+        const QTextBlock block = edit.document()->findBlockByNumber(number);
+        starts.push_back(qint64(block.position()) + number);
+    }
+    model_.setTextWithStarts(edit.windowText(), areLines ? starts : ReportModel::headersIn(edit.windowText()));
 }
 
 void ModelledReport::actAsUser(const ReportStep &step)
 {
-    UReportView *view = visibleView(step.a);
-    if (view == nullptr) {
+    Shown *shown = visibleView(step.a);
+    if (shown == nullptr) {
         return;
     }
     const bool isStale = std::any_of(views_.begin(), views_.end(), [](const Shown &one) { return one.isStale; });
     if (isStale) {
         tellViews(); // what is typed into another text than the report's takes the place of that
     }
-    if (view->GetEdit().isLoading()) {
-        QTest::keyClick(&view->GetEdit(), step.c % 2 == 0 ? Qt::Key_X : Qt::Key_Delete); // which edits nothing
-    } else {
-        actInView(*view, step);
+    kareport::ReportEdit &edit = shown->view->GetEdit();
+    if (edit.isLoading()) {
+        QTest::keyClick(&edit, step.c % 2 == 0 ? Qt::Key_X : Qt::Key_Delete); // which edits nothing
+    } else if (isRich_ && !shown->isEdited) {
+        typeIntoImage(*shown, step);
+    } else if (!isRich_ || step.op != ReportOp::TakeAll) {
+        actInView(*shown, step);
     }
 }
 
@@ -329,8 +491,9 @@ int ModelledReport::placeIn(int length, int number)
     return length <= range ? number % length : static_cast<int>(qint64(number) * (length - 1) / range);
 }
 
-void ModelledReport::actInView(UReportView &view, const ReportStep &step)
+void ModelledReport::actInView(Shown &shown, const ReportStep &step)
 {
+    UReportView &view = *shown.view;
     kareport::ReportEdit &edit = view.GetEdit();
     const int length = edit.document()->characterCount();
     const int place = placeIn(length, step.b);
@@ -383,6 +546,11 @@ void ModelledReport::actInView(UReportView &view, const ReportStep &step)
         model_.replace(seen.at, seen.removed, seen.inserted);
         isModified_ = true;
     }
+    if (isRich_ && !spy.edits.empty()) {
+        for (Shown &one : views_) { // the image takes the place of what was edited there
+            one.isEdited = &one == &shown;
+        }
+    }
 }
 
 void ModelledReport::putWholeLines(kareport::ReportEdit &edit, int from, int to, bool isWhole)
@@ -404,6 +572,9 @@ QString ModelledReport::compareReport(const QString &text)
 {
     if (wrongAnswer_) {
         return QStringLiteral("an operation answered wrong");
+    }
+    if (!wrongSave_.isEmpty()) {
+        return wrongSave_;
     }
     if (report().CopyText() != text) {
         return QStringLiteral("the text is \"%1\" and not \"%2\"").arg(brief(report().CopyText()), brief(text));
@@ -427,6 +598,14 @@ QString ModelledReport::compareViews(const QString &text)
     for (std::size_t i = 0; i < views_.size(); ++i) {
         const Shown &one = views_[i];
         if (one.isStale) {
+            continue;
+        }
+        if (isRich_ && !one.isEdited) {
+            const QString image = one.view->GetEdit().windowText();
+            if (inkOf(image) != inkOf(image_)) {
+                return QStringLiteral("view %1 shows \"%2\" and not the image of \"%3\"")
+                    .arg(QString::number(i), brief(image), brief(image_));
+            }
             continue;
         }
         QString wrong = wrongWithText(*one.view, text);

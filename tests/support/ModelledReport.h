@@ -33,12 +33,13 @@ private:
         UReportView *view;
         bool isHidden = false;
         bool isStale = false;
+        bool isEdited = false; ///< in rich-text mode: it shows the report's text, others the image of what was written
     };
 
     void openView(bool inPieces) { views_.push_back({&shown_.open(inPieces)}); }
 
     /// The view that a user works in; null when all are hidden.
-    UReportView *visibleView(int number) const;
+    Shown *visibleView(int number);
 
     void tellViews();
 
@@ -62,19 +63,29 @@ private:
 
     void reload();
 
+    /// A host loads a file at the end of the report.
+    void load(const ReportStep &step);
+
+    /// Saves that change nothing, but that the report is then as its file.
+    void saveAlone();
+    void saveRichText();
+
     bool isAllCrLf() const;
 
     /// Rich-text mode on, something written and typed, and off again: what was typed is then the report's text.
     void actInRichText(const ReportStep &step);
+    void switchOn();
+    void switchOff();
 
-    void followText(kareport::ReportEdit &edit);
+    /// A key in a view that shows the image of what was written: the report's text is then what the view shows.
+    void typeIntoImage(Shown &shown, const ReportStep &step);
 
     void actAsUser(const ReportStep &step);
 
     /// A place in a text, all over it also where that is long.
     static int placeIn(int length, int number);
 
-    void actInView(UReportView &view, const ReportStep &step);
+    void actInView(Shown &shown, const ReportStep &step);
 
     static void putWholeLines(kareport::ReportEdit &edit, int from, int to, bool isWhole);
 
@@ -88,6 +99,9 @@ private:
     std::vector<Shown> views_;
     QTemporaryDir folder_;
     QString &clip_;
+    bool isRich_ = false; ///< rich-text mode is on
+    QString image_;       ///< what was written since
+    QString wrongSave_;
     bool isModified_ = false;
     bool wrongAnswer_ = false;
     bool canUndoExactly_ = false;

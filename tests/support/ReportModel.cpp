@@ -140,6 +140,24 @@ void ReportModel::skipLines(int count)
     }
 }
 
+void ReportModel::load(const QStringList &lines, bool keepsEnds)
+{
+    const qint64 before = size();
+    for (const QString &line : lines) {
+        writeLine(keepsEnds ? line + u'\n' : line, 0, 1);
+        ++lineCount_;
+    }
+    if (before == size() || headersIn(text().mid(before)).empty()) {
+        return; // the pages that it was written in now
+    }
+    for (auto cell = cells_.begin() + before; cell != cells_.end(); ++cell) {
+        cell->starts = false;
+    }
+    startsAtEnd_ = false;
+    findHeaders(before);
+    history_.clear(); // of the pages that there were
+}
+
 void ReportModel::reload(const QString &text)
 {
     clear();
@@ -175,17 +193,11 @@ void ReportModel::withCrLf()
     history_.clear();
 }
 
-void ReportModel::adoptStarts(const std::vector<qint64> &starts)
+void ReportModel::setTextWithStarts(const QString &text, const std::vector<qint64> &starts)
 {
-    for (Cell &cell : cells_) {
-        cell.starts = false;
-    }
+    setText(text);
     for (const qint64 start : starts) {
-        if (start < size()) {
-            cells_[static_cast<std::size_t>(start)].starts = true;
-        } else {
-            startsAtEnd_ = true;
-        }
+        (start < size() ? cells_[static_cast<std::size_t>(start)].starts : startsAtEnd_) = true;
     }
 }
 

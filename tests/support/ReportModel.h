@@ -45,13 +45,15 @@ public:
     void writeLine(const QString &text, int before, int after);
     void writeTable(const ModelTable &table);
     void writeBlock(const QStringList &lines, int before, int after);
+    /// A file has been read at the end of the report. @param keepsEnds  whether its lines keep their own line ends
+    void load(const QStringList &lines, bool keepsEnds);
     /// The report has been read back from its file.
     void reload(const QString &text);
     /// The view has put the same text with other line ends instead of this one.
     void withCrLf();
 
-    /// Takes the starts as they are, where how they came about is no part of the model.
-    void adoptStarts(const std::vector<qint64> &starts);
+    /// Another text has taken the place of this one, whose pages begin there.
+    void setTextWithStarts(const QString &text, const std::vector<qint64> &starts);
 
     // What the user does
 
@@ -64,6 +66,8 @@ public:
     std::vector<qint64> starts() const { return absolute(startsAt(0, size()), 0); }
 
     std::vector<kareport::ReportPage> pages() const;
+    /// Where lines of a text begin that are page headers.
+    static std::vector<qint64> headersIn(const QString &text);
 
 private:
     struct Cell
@@ -85,7 +89,6 @@ private:
     void endHeading() { setHeading(QString(), 0, 2); }
     static bool isHeader(const QString &line);
     bool beginsLine(qint64 at) const { return at == 0 || cells_[static_cast<std::size_t>(at - 1)].character == u'\n'; }
-    static std::vector<qint64> headersIn(const QString &text);
     void findHeaders(qint64 from);
     std::vector<qint64> startsAt(qint64 at, qint64 length) const;
     static std::vector<qint64> absolute(std::vector<qint64> offsets, qint64 at);
