@@ -18,7 +18,7 @@ bool showsReport(const UView *view);
 std::vector<UView *> reportViews(const UReportDoc &report);
 /// Lets the views of a report that load its text in pieces load the rest at once: who saves a report sees all of what is
 /// saved. Where there is no memory for that, they go on in pieces.
-KAREPORT_EXPORT void finishLoading(const UReportDoc &report);
+void finishLoading(const UReportDoc &report);
 
 /// Opens a new pane for a report, and notes that it is the report's own. Nothing without the template for reports.
 void openOwnPane(UReportDoc &report);

@@ -1,7 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
-
 #include <QString>
 #include <QStringList>
 
@@ -10,9 +8,9 @@ namespace kareport
 
 /// The known name that somebody may have meant by a misspelt one, without regard to case: a few letters are wrong, or one of
 /// the two is the beginning of the other. Empty when none is near. Of names that are equally near, the first.
-KAREPORT_EXPORT QString nearestName(QStringView misspelt, const QStringList &known);
+QString nearestName(QStringView misspelt, const QStringList &known);
 
 /// A question such as `did you mean "Elevation"?`, or empty when no name is near.
-KAREPORT_EXPORT QString didYouMean(QStringView misspelt, const QStringList &known);
+QString didYouMean(QStringView misspelt, const QStringList &known);
 
 } // namespace kareport

@@ -62,8 +62,8 @@ bool replaceFile(const QString &path, const std::function<bool(QIODevice &)> &wr
     if (!reason.isEmpty()) {
         return finish(false, error, reason);
     }
-    const bool isDone = file.commit(); // before its reason is asked for: arguments are evaluated in any order
-    return finish(isDone, error, file.errorString());
+    // The reason is there after the commit only, and needs memory, which must not fail after a commit that is done.
+    return file.commit() || finish(false, error, file.errorString());
 }
 
 } // namespace kareport
