@@ -51,7 +51,8 @@ void setPitch(QFont &font, QPaintDevice &device, qreal advance, int pitch)
 void fillGlyphs(PrintFace &face)
 {
     QString characters;
-    for (char16_t character = 0; character < face.glyphs.size(); ++character) {
+    for (std::size_t code = 0; code < face.glyphs.size(); ++code) {
+        const auto character = static_cast<char16_t>(code);
         characters += standsAlone(character) ? QChar(character) : QChar(u' ');
     }
     face.raw = QRawFont::fromFont(face.font);

@@ -18,8 +18,8 @@ namespace kareport
 namespace
 {
 
-/// What is read at a time: near to the processor, and read well before somebody who stops the work notices.
-constexpr qsizetype pieceSize = 256 * 1024;
+/// What is read at a time: near to the processor, and read well before a user who stops the work notices.
+constexpr qsizetype pieceSize = qsizetype(256) * 1024;
 
 /// The next bytes, up to a line end where one follows: no character and no line end is cut in two.
 QByteArrayView nextPiece(QByteArrayView bytes)

@@ -25,7 +25,7 @@ std::optional<QString> askReportName(UDocument &document, bool richTextFirst)
     request.filter = (richTextFirst ? Xlate("RTF Files (*.rtf)|*.rtf|Report Files (*.rep)|*.rep|PDF (*.pdf)|*.pdf|")
                                     : Xlate("Report Files (*.rep)|*.rep|RTF Files (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|")) +
                      standardText(allFilesTitle) + QStringLiteral("|*.*||");
-    const auto chosen = askSaveName(request);
+    auto chosen = askSaveName(request);
     if (chosen) {
         SetLastOpenDir(*chosen, lastReportFolder);
     }

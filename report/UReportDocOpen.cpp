@@ -22,7 +22,7 @@ namespace
 constexpr QLatin1StringView firstWord("TALVEN");
 
 /// The most of a file's first line that is looked at to tell what it is.
-constexpr qint64 longestProbe = 64 * 1024;
+constexpr qint64 longestProbe = qint64(64) * 1024;
 
 /// Whether a file may be rich text by its name.
 bool namesRichText(const QString &path)
@@ -57,7 +57,7 @@ bool readLines(QIODevice &file, kareport::PageWriter &page, bool mayBeRichText, 
         if (!keepLineEnds && line.endsWith(u'\n')) {
             line.chop(1);
         }
-        // What stands before the first word of a report is the byte-order mark; in rich text it is the head.
+        // What comes before the first word of a report is the byte-order mark; in rich text it is the head.
         if (!isRichText && page.lineCount() == 0 && line.indexOf(firstWord) > 0) {
             line = line.sliced(line.indexOf(firstWord));
         }
@@ -127,7 +127,7 @@ void UReportDoc::Serialize(UArchive &archive)
     const bool isLoaded = LoadFile(archive.GetFilePath(), true) != 0;
     // A view or an editor that took the text may have closed the report.
     if (!isLoaded && IsReportAvailable(this)) {
-        archive.Abandon(); // the file has gone meanwhile, or there is no memory for it
+        archive.Abandon(); // the file was removed meanwhile, or there is no memory for it
     }
 }
 

@@ -21,7 +21,7 @@ QTextDocument *newDocument(QWidget *parent, const QFont &font)
     return document;
 }
 
-/// Rich text names its colours for paper, so it is shown on paper also where the desktop is dark.
+/// Colours of rich text are meant for paper, so it is shown on a white background even if the desktop is dark.
 QPalette paper()
 {
     QPalette palette;
@@ -47,7 +47,7 @@ void ReportEdit::loadPlainTextInPieces(PiecedText text, std::function<void(bool 
     QTextDocument *filled = newDocument(this, font());
     filled->setUndoRedoEnabled(false);
     auto loader = std::make_unique<PieceLoader>(*filled, std::move(text), [this] { loadPiece(); });
-    loader->addPiece(); // before the control's cursor stands in the document, at whose end the pieces come in
+    loader->addPiece(); // before the control's cursor is in the document, at whose end the pieces come in
     take(filled);
     document()->setUndoRedoEnabled(false);
     loader_ = std::move(loader);
@@ -142,7 +142,7 @@ ReportEdit::loadRichText(const std::function<std::optional<RichTextError>(QTextD
 {
     setPalette(paper());
     QTextDocument *loaded = newDocument(this, font());
-    const auto error = read(*loaded);
+    auto error = read(*loaded);
     take(loaded);
     return error;
 }

@@ -43,7 +43,7 @@ UReportView::~UReportView()
         frame->GetRibbonBar().RemoveRibbonTabIndexForView(this);
     }
     if (widget_) {
-        // It may be in the middle of the very key that closes the view.
+        // It may be handling the key press that closes the view.
         auto *widget = static_cast<ReportViewWidget *>(widget_.data());
         edit_->setFocusHandler({});
         edit_->setEditHandler({});
@@ -179,7 +179,7 @@ bool UReportView::streamPlainText(QIODevice &device) const
     }
     edit_->finishLoading();
     // Line by line, so that a long report is not copied as a whole.
-    constexpr qsizetype pieceSize = 64 * 1024;
+    constexpr qsizetype pieceSize = qsizetype(64) * 1024;
     QString piece;
     for (QTextBlock block = edit_->document()->begin(); block.isValid(); block = block.next()) {
         piece += block.text().replace(QChar::LineSeparator, QLatin1Char('\n'));

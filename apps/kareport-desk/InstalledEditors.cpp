@@ -23,7 +23,7 @@ QHash<QString, QString> readDescription(const QString &path)
 {
     QHash<QString, QString> entries;
     QFile file(path);
-    constexpr qint64 longest = 1024 * 1024;
+    constexpr qint64 longest = qint64(1024) * 1024;
     if (!file.open(QIODevice::ReadOnly) || file.size() > longest) {
         return entries;
     }
@@ -65,7 +65,7 @@ std::optional<InstalledEditor> editorOf(const QHash<QString, QString> &entries)
 std::vector<InstalledEditor> installedEditors(const QStringList &folders)
 {
     std::vector<InstalledEditor> editors;
-    QSet<QString> described; // what stands in an earlier folder hides its namesakes in later ones
+    QSet<QString> described; // a file in an earlier folder hides files of that name in later ones
     const QStringList places =
         folders.isEmpty() ? QStandardPaths::standardLocations(QStandardPaths::ApplicationsLocation) : folders;
     for (const QString &folder : places) {

@@ -47,7 +47,7 @@ std::vector<FileKind> kindsOf(const QString &filter)
     return kinds;
 }
 
-/// Qt's dialog takes names in folders that are not there. @return false, having said so
+/// Qt's dialog takes names in folders that are not there. @return false, after a message
 bool hasFolder(const QString &path, const SaveRequest &request)
 {
     const QString folder = QFileInfo(path).absolutePath();
@@ -93,7 +93,7 @@ void exportPdf(const UReportDoc &report, const QString &path)
     if (report.HasLostText()) {
         problem = Xlate("a part of the report was lost when memory ran out");
     } else if (makesNoPage(report)) {
-        problem = Xlate("the report is empty, and a PDF has one page at least");
+        problem = Xlate("the report is empty, and a PDF has at least one page");
     } else {
         const WaitCursor cursor;
         finishLoading(report);
@@ -140,7 +140,7 @@ std::optional<QString> askSavePath(QWidget *parent, const SaveRequest &request)
     }
     while (dialog.exec() == QDialog::Accepted) {
         const qsizetype chosen = titles.indexOf(dialog.selectedNameFilter());
-        const QString path = withEndingOf(dialog.selectedFiles().value(0), patterns.value(chosen), patterns);
+        QString path = withEndingOf(dialog.selectedFiles().value(0), patterns.value(chosen), patterns);
         if (hasFolder(path, request) && mayReplace(path, request)) {
             return path;
         }
@@ -151,7 +151,7 @@ std::optional<QString> askSavePath(QWidget *parent, const SaveRequest &request)
 std::optional<QString> askOwnName(const SaveRequest &request,
                                   const std::function<std::optional<QString>(const SaveRequest &)> &ask)
 {
-    const auto path = ask(request);
+    auto path = ask(request);
     const auto *report = dynamic_cast<const UReportDoc *>(request.document);
     // The report may have been closed while the dialog was open.
     if (!path || report == nullptr || !isPdfName(*path) || !UReportDoc::IsReportAvailable(report)) {

@@ -30,7 +30,7 @@ std::optional<InputError> sameFile(const QString &input, const Output &output)
         return std::nullopt;
     }
     return InputError{input, std::nullopt,
-                      Xlate("the output \"%1\" is the report that is read: another one was expected").arg(output.file)};
+                      Xlate("the output \"%1\" is the report being read: another file was expected").arg(output.file)};
 }
 
 Expected<SavedText> readSavedFile(const QString &path)
@@ -75,12 +75,12 @@ void writeSaved(UReportDoc &report, const QString &text)
 
 std::optional<QString> ConvertCommand::usageError() const
 {
-    if (const auto wrong = wrongKindName(as)) {
+    if (auto wrong = wrongKindName(as)) {
         return wrong;
     }
     for (const QString &set : sets) {
         if (!set.startsWith(u"page.")) {
-            return Xlate("--set \"%1\": a key of the page was expected, as page.linesPerPage=60").arg(set);
+            return Xlate("--set \"%1\": a key of the page was expected, such as page.linesPerPage=60").arg(set);
         }
     }
     return wrongOutput(output, as);
@@ -113,7 +113,7 @@ ExitStatus ConvertCommand::run(int &argc, char **argv) const
     TerminalProgress bar(progress);
     UReportDoc report(surroundingsOf(job));
     if (const auto error = JobRunner(job, source, bar).run(report)) {
-        return usageExit(Xlate("--set: %1").arg(error->text)); // no input is left that could be wrong
+        return usageExit(Xlate("--set: %1").arg(error->text)); // all input has been checked
     }
     writeSaved(report, saved.text);
     saved.text = QString(); // the report holds it all now

@@ -48,7 +48,7 @@ std::vector<unsigned> FaceGlyphs::partsOf(unsigned glyph) const
         if (FT_Load_Glyph(face_->face, parts[next], FT_LOAD_NO_SCALE | FT_LOAD_NO_RECURSE) != 0) {
             continue;
         }
-        const FT_GlyphSlot slot = face_->face->glyph;
+        auto *const slot = face_->face->glyph;
         for (FT_UInt i = 0; slot->format == FT_GLYPH_FORMAT_COMPOSITE && i < slot->num_subglyphs; ++i) {
             FT_Int part = 0;
             FT_UInt flags = 0;

@@ -11,7 +11,8 @@ namespace
 {
 
 constexpr std::size_t planeSize = 0x10000;
-/// Up to this much narrower than its room a glyph is centred in it: readers take a gap of a tenth for a blank.
+/// A glyph that is narrower than its room by no more than this is centred in it: readers interpret a gap of a tenth as
+/// a blank.
 constexpr double slack = 50;
 /// The most that a glyph is widened: a wide one of 1000 fills two cells of 602.
 constexpr double mostStretch = 1.25;
@@ -91,7 +92,7 @@ std::size_t PdfClusters::fontOf(char32_t character) const
 PdfClusters::Spelling PdfClusters::spellingOf(const std::u32string &characters) const
 {
     const std::size_t font = fontOf(characters.front());
-    const Spelling apart{characters, font};
+    Spelling apart{characters, font};
     if (characters.size() == 1) {
         return apart;
     }
@@ -104,7 +105,7 @@ PdfClusters::Spelling PdfClusters::spellingOf(const std::u32string &characters) 
     if (font < fonts_->size() && (*fonts_)[font].covers(composed.front())) {
         return {composed, font};
     }
-    // What the letter's own face does not have as one character is taken from another only where it cannot be put together.
+    // A character that the letter's own face does not have is taken from another face only if it cannot be composed.
     const bool canBePutTogether =
         std::all_of(characters.begin(), characters.end(), [this](char32_t c) { return fontOf(c) < fonts_->size(); });
     const std::size_t other = fontOf(composed.front());
@@ -129,7 +130,7 @@ PdfCluster PdfClusters::put(QStringView text)
         font = std::min(fontOf(base), fonts_->size() - 1);
         cluster.text.replace(0, QChar::requiresSurrogates(drawn.front()) ? 2 : 1, QChar(substitute_));
     }
-    // A mark without a letter stands in the cell that follows, and takes none.
+    // A mark without a letter is drawn in the cell that follows, and takes none.
     const double width = std::max(1, cluster.cells) * double(cell_);
     if (!show(font, static_cast<char16_t>(base))) {
         return cluster;

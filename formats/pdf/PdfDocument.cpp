@@ -77,7 +77,7 @@ bool PdfDocument::save(QIODevice &device)
     }
     // Piece by piece: the library holds the whole of it already.
     HPDF_UINT32 left = HPDF_GetStreamSize(document_);
-    std::array<HPDF_BYTE, 64 * 1024> piece;
+    std::array<HPDF_BYTE, std::size_t(64) * 1024> piece;
     bool isWritten = left > 0;
     while (isWritten && left > 0) {
         HPDF_UINT32 size = std::min(left, static_cast<HPDF_UINT32>(piece.size()));

@@ -82,7 +82,7 @@ std::optional<PdfFace> faceOfFamily(const char *family)
         {
             continue;
         }
-        // Of several files the first by name is taken, so that the choice does not hang on the order of a folder.
+        // Of several files the first by name is taken, so that the choice does not depend on the order of a folder.
         const QString name = QFile::decodeName(reinterpret_cast<const char *>(file));
         if (!best || name < best->file) {
             best = Found{name, index, found->fonts[i]};
@@ -107,7 +107,7 @@ bool coversPlainText(const PdfFace &face)
 
 } // namespace
 
-PdfFace::PdfFace(QString file, unsigned index, bool isCollection)
+PdfFace::PdfFace(const QString &file, unsigned index, bool isCollection)
     : PdfFace(file, index, isCollection, coverageOf(file, index))
 {}
 

@@ -17,7 +17,7 @@ public:
     struct Coverage;
 
     /// Reads what a file covers. A file that is no font covers nothing and is refused when it is embedded.
-    PdfFace(QString file, unsigned index, bool isCollection);
+    PdfFace(const QString &file, unsigned index, bool isCollection);
     PdfFace(QString file, unsigned index, bool isCollection, std::shared_ptr<const Coverage> coverage);
 
     const QString &file() const { return file_; }
@@ -36,15 +36,15 @@ private:
 /// The folders that the system's fonts are in.
 QStringList systemFontFolders();
 
-/// The face that stands first, whatever a report holds, where the system has it: MSGOTHIC.TTC or else lucon.TTF.
+/// The face that comes first, whatever a report holds, where the system has it: MSGOTHIC.TTC or else lucon.TTF.
 std::optional<PdfFace> preferredPdfFace(const QStringList &fontFolders);
 /// The fixed-pitch faces of the system in the order in which they are tried, collections with CJK last.
 std::vector<PdfFace> fixedPitchPdfFaces();
 
 /// The faces of a PDF: the one that its grid is made of comes first, each of the others shows what those before it lack.
 /// None where the system has no face at all.
-/// @param preferred  stands first whatever it covers
-/// @param others     in the order of preference; the first of them that has all of plain text stands first otherwise
+/// @param preferred  comes first whatever it covers
+/// @param others     in the order of preference; otherwise the first of them that has all of plain text comes first
 std::vector<PdfFace> orderPdfFaces(const std::optional<PdfFace> &preferred, const std::vector<PdfFace> &others);
 
 } // namespace kareport

@@ -89,8 +89,8 @@ void PdfFont::show(char16_t character)
         return;
     }
     isShown_[character] = true;
-    // Asked for the width of a character, the library embeds its glyph and the parts of it, but not the parts of the
-    // parts, and none beyond the 32767th glyph: the Greek epsilon or a Hangul syllable would stay blank.
+    // When asked for the width of a character, the library embeds its glyph and its components, but not the components
+    // of the parts, and none beyond the 32767th glyph: the Greek epsilon or a Hangul syllable would stay blank.
     HPDF_Font_GetUnicodeWidth(font_, character);
     const auto *face = static_cast<HPDF_TTFontDefAttr>(attributesOf(font_)->fontdef->attr);
     for (const unsigned part : glyphs_->partsOf(glyphOf(character))) {
@@ -113,8 +113,8 @@ bool PdfFont::describeCharacters()
 
 bool PdfFont::writeWidths(const std::vector<char16_t> &shown)
 {
-    // The library lists the widths of all characters that the face has, one by one: 200 KB for a CJK face.
-    const HPDF_Dict font = attributesOf(font_)->descendant_font;
+    // The library lists the widths of all characters of the face one by one: 200 KB for a CJK face.
+    auto *const font = attributesOf(font_)->descendant_font;
     std::map<int, int> counts;
     for (const char16_t character : shown) {
         ++counts[advanceOf(character)];
@@ -124,7 +124,7 @@ bool PdfFont::writeWidths(const std::vector<char16_t> &shown)
     if (usual == counts.end()) {
         return true;
     }
-    const HPDF_Array widths = HPDF_Array_New(font_->mmgr);
+    auto *const widths = HPDF_Array_New(font_->mmgr);
     bool isDone = widths != nullptr;
     HPDF_Array run = nullptr;
     int next = -1; // the character that would continue the run
@@ -146,7 +146,7 @@ bool PdfFont::writeWidths(const std::vector<char16_t> &shown)
 
 bool PdfFont::writeGlyphs(const std::vector<char16_t> &shown)
 {
-    QByteArray glyphs(shown.empty() ? 2 : 2 * (shown.back() + 1), '\0');
+    QByteArray glyphs(shown.empty() ? 2 : 2 * (qsizetype(shown.back()) + 1), '\0');
     for (const char16_t character : shown) {
         const unsigned glyph = glyphOf(character);
         glyphs[2 * character] = static_cast<char>(glyph >> 8);

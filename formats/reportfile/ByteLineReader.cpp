@@ -11,7 +11,7 @@ namespace kareport
 namespace
 {
 
-constexpr qsizetype chunkSize = 256 * 1024;
+constexpr qsizetype chunkSize = qsizetype(256) * 1024;
 
 } // namespace
 
@@ -50,12 +50,12 @@ bool ByteLineReader::next()
         taken = ends ? taken + 1 : content;
     }
     if (!ends) {
-        // A CR whose LF may stand after what was looked at belongs to the next piece.
+        // A CR whose LF may follow what was looked at belongs to the next piece.
         content = taken = std::min(content, longestPiece);
     }
     size_ = content;
     if (ends) {
-        line[size_++] = '\n'; // where it stood, or in place of the CR before it
+        line[size_++] = '\n'; // where it was, or in place of the CR before it
     }
     taken_ = taken;
     at_ += taken;

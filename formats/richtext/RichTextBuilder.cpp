@@ -8,7 +8,7 @@ namespace kareport
 namespace
 {
 
-constexpr qsizetype pieceSize = 64 * 1024;
+constexpr qsizetype pieceSize = qsizetype(64) * 1024;
 
 } // namespace
 
@@ -37,7 +37,7 @@ void RichTextBuilder::endParagraph(const RichTextParagraph &paragraph, int forma
         insert(QStringView(paragraph_).sliced(begin, run.end - begin), run.format);
         begin = run.end;
     }
-    // Not clear(), which would give the room back.
+    // Not clear(), which would release the memory.
     paragraph_.resize(0);
     runs_.clear();
 }

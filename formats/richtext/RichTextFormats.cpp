@@ -15,7 +15,7 @@ namespace
 
 /// QTextDocument finds a format by a sum over its properties, in which all lists of tab stops count the same, and all font
 /// names. A file can hold any number of formats of the same sum, and each would be compared with all before it. A document
-/// of people never has so many; in one that has, a property of no meaning sets the further formats apart.
+/// written by a person never has so many; in one that has, a property without meaning keeps further formats apart.
 constexpr std::size_t formatsOfPeople = 500;
 constexpr int setsApart = QTextFormat::UserProperty + 0x4B52;
 
@@ -59,7 +59,7 @@ QTextBlockFormat make(const RichTextParagraph &paragraph)
         format.setAlignment(static_cast<Qt::AlignmentFlag>(paragraph.alignment));
     }
     const auto &twips = paragraph.twips;
-    const auto measure = [&](RichTextMeasure which, auto set) {
+    const auto measure = [&](std::size_t which, auto set) {
         if (twips[which] != 0) {
             (format.*set)(pixels(twips[which]));
         }

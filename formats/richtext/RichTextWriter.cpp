@@ -15,7 +15,7 @@ namespace kareport
 namespace
 {
 
-constexpr qsizetype pieceSize = 64 * 1024;
+constexpr qsizetype pieceSize = qsizetype(64) * 1024;
 
 /// Gathers bytes and writes them in pieces.
 class Output
@@ -24,7 +24,7 @@ public:
     explicit Output(QIODevice &device) : device_(device) { bytes_.reserve(2 * pieceSize); }
 
     QByteArray &bytes() { return bytes_; }
-    /// Writes what has been gathered, once that is worth while. @return false where it cannot
+    /// Writes what has been gathered, once that is worthwhile. @return false where it cannot
     bool pass() { return bytes_.size() < pieceSize || flush(); }
     bool flush()
     {

@@ -12,7 +12,7 @@ namespace kareport
 namespace
 {
 
-constexpr qsizetype pieceSize = 64 * 1024;
+constexpr qsizetype pieceSize = qsizetype(64) * 1024;
 
 bool writeBytes(QIODevice &device, QStringView text, WideCharacters wide)
 {

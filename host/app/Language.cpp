@@ -13,7 +13,7 @@
 #include <utility>
 #include <vector>
 
-// The files stand in the library: whoever links it has them.
+// The files are in the library, so every program that links it has them.
 static void registerTranslations()
 {
     Q_INIT_RESOURCE(translations);
@@ -27,7 +27,7 @@ namespace
 
 const QString folder = QStringLiteral(":/kareport/translations");
 
-/// Translators in use, owned by the application; they go with the next language.
+/// Translators in use, owned by the application; they are deleted with the next language.
 std::vector<QPointer<QTranslator>> &installed()
 {
     static std::vector<QPointer<QTranslator>> translators;
@@ -80,7 +80,7 @@ QString setLanguage(const QString &language)
         delete translator; // which takes it out of use
     }
     const QString name = language.isEmpty() ? QLocale::system().name() : language;
-    const QString code = name.section(u'_', 0, 0);
+    QString code = name.section(u'_', 0, 0);
     if (!translatedLanguages().contains(code) || !install(QStringLiteral("kareport_") + code, folder)) {
         return QStringLiteral("en");
     }

@@ -84,7 +84,7 @@ std::weak_ordering compareNaturally(QStringView left, QStringView right)
             return leftIsNumber ? std::weak_ordering::less : std::weak_ordering::greater;
         }
         const auto order = leftIsNumber ? compareDigitRuns(leftRun, rightRun) : compareFolded(leftRun, rightRun);
-        if (order != 0) {
+        if (std::is_neq(order)) {
             return order;
         }
     }
@@ -117,7 +117,7 @@ std::weak_ordering compareEntries(const UDictEntry *left, const UDictEntry *righ
 std::weak_ordering compareObjects(const UDataObject &left, const UDataObject &right, const std::vector<unsigned> &ids)
 {
     for (const unsigned id : ids) {
-        if (const auto order = compareEntries(left.Find(id), right.Find(id)); order != 0) {
+        if (const auto order = compareEntries(left.Find(id), right.Find(id)); std::is_neq(order)) {
             return order;
         }
     }

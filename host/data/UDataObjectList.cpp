@@ -16,7 +16,7 @@ UDataObject *UDataObjectList::GetAt(std::size_t index)
 void UDataObjectList::Sort(const std::vector<unsigned> &ids)
 {
     std::stable_sort(objects_.begin(), objects_.end(), [&ids](const auto &left, const auto &right) {
-        return kareport::compareObjects(*left, *right, ids) < 0;
+        return std::is_lt(kareport::compareObjects(*left, *right, ids));
     });
 }
 

@@ -28,7 +28,7 @@ using UnfinishedPane = std::unique_ptr<CViewPane, CloseUnfinishedPane>;
 
 } // namespace
 
-/// A document that is being made: it goes again, with its views, where that fails.
+/// A document that is being made: it is destroyed, with its views, if that fails.
 struct UDocTemplate::UnfinishedDocument
 {
     UDocument *document;
@@ -66,7 +66,7 @@ void UDocTemplate::CloseAllDocuments()
         UDocument *document = documents_.back();
         document->SetAutoDelete(true);
         document->OnCloseDocument();
-        // A document that defers its closing goes all the same.
+        // A document that defers its closing is destroyed all the same.
         if (!documents_.empty() && documents_.back() == document) {
             document->CloseAllPanes();
             document->EndDocument();
@@ -85,7 +85,7 @@ UDocument *UDocTemplate::OpenReportDocumentFile(const QString &path, int /*addTo
     document->docTemplate_ = this;
     documents_.push_back(document);
     UnfinishedDocument unfinished(made.release(), pane);
-    // While it is being filled, the document must not go with a pane that closes.
+    // While it is being filled, the document must not be destroyed with a pane that closes.
     const bool autoDelete = document->IsAutoDelete();
     document->SetAutoDelete(false);
 
@@ -105,7 +105,7 @@ UDocument *UDocTemplate::OpenReportDocumentFile(const QString &path, int /*addTo
     if (CViewPane::IsOpen(pane)) {
         InitialUpdatePane(pane, document, makeVisible);
     }
-    ownPane.release();
+    static_cast<void>(ownPane.release()); // it owns itself now
     unfinished.document = nullptr;
     document->SetAutoDelete(autoDelete);
     return document;

@@ -52,7 +52,7 @@ double roundingError(double a, double b, double product)
 #ifdef FP_FAST_FMA
     return std::fma(a, b, -product);
 #else
-    // Without the instruction at hand, the library's function for it is called through two jumps, and on some processors
+    // Without the instruction, the library's function for it is called through two jumps, and on some processors
     // costs ten times the rest of a number. Halves of 26 bits multiply exactly.
     constexpr double splitter = 134217729.0; // 2^27 + 1
     const auto highHalf = [](double value) {
@@ -125,7 +125,8 @@ void FixedNotation::writeExactly(double magnitude, int decimals)
 {
     const int exact = std::min(decimals, mostExactDecimals);
     // The largest double has 309 digits before its point.
-    long_.resize(static_cast<std::size_t>(310 + 1 + exact));
+    const int longest = 310 + 1 + exact;
+    long_.resize(static_cast<std::size_t>(longest));
     const auto result =
         std::to_chars(long_.data(), long_.data() + long_.size(), magnitude, std::chars_format::fixed, exact);
     long_.resize(static_cast<std::size_t>(result.ptr - long_.data()));

@@ -45,7 +45,7 @@ TEST(ThousandReports, LeaveNothingBehind)
     Desk desk;
     constexpr int warmUp = 100; // caches of fonts, styles and texts fill meanwhile
     constexpr int reports = 1000;
-    constexpr std::size_t mostGrowth = 256 * 1024; // a quarter of a kilobyte a report would be seen
+    constexpr std::size_t mostGrowth = std::size_t(256) * 1024; // a quarter of a kilobyte a report would be seen
     std::size_t before = 0;
     for (int number = 0; number < warmUp + reports; ++number) {
         if (number == warmUp) {
