@@ -1,6 +1,5 @@
 // The desktop program up to its first painted window: timed as a whole process.
 #include "DeskApplication.h"
-#include "DeskDialogs.h"
 #include "DeskFrame.h"
 #include "DeskPreferences.h"
 #include "Language.h"

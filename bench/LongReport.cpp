@@ -5,7 +5,6 @@
 //   ka_long_report FILE --bare       the text FILE in the bare control
 //   ka_long_report FILE --view-edit  a report that was made of the lines of FILE is opened by View\Edit Report
 #include "DeskApplication.h"
-#include "DeskDialogs.h"
 #include "DeskFrame.h"
 #include "ProcessorTime.h"
 #include "Profile.h"
@@ -31,7 +30,7 @@
 namespace
 {
 
-/// Ticks as often as it can and keeps the longest time between two ticks.
+/// Ticks as often as possible and keeps the longest time between two ticks.
 class Pulse
 {
 public:
@@ -157,5 +156,5 @@ int main(int argc, char **argv)
                 static_cast<double>(time.elapsed()) / 1000, static_cast<long long>(pulse.longest()),
                 pulse.longestWork(), lines);
     std::fflush(stdout);
-    std::_Exit(0); // what it takes to give it all up is not measured
+    std::_Exit(0); // the time to close everything is not measured
 }

@@ -30,12 +30,12 @@ void PageLines::load(std::vector<int> starts, int lineCount, const IsBlank &isBl
 
 void PageLines::replace(int line, int removed, int added, const std::vector<int> &starts, const IsBlank &isBlank)
 {
-    const int behind = line + removed; // the last line that the edit has touched, as it was
+    const int lastEdited = line + removed; // the last line that the edit has touched, as it was
     const int growth = added - removed;
     const int stopBefore = stop();
 
     const auto first = std::lower_bound(starts_.begin(), starts_.end(), line);
-    auto last = std::upper_bound(first, starts_.end(), behind);
+    auto last = std::upper_bound(first, starts_.end(), lastEdited);
     if (growth != 0) {
         std::for_each(last, starts_.end(), [growth](int &start) { start += growth; });
     }
@@ -46,14 +46,14 @@ void PageLines::replace(int line, int removed, int added, const std::vector<int>
     lineCount_ += growth;
 
     const auto follow = [&](int lastLine, int lineStop) {
-        return lastLine > behind ? lastLine + growth : lastNotBlank(std::min(lineStop, line + added + 1), isBlank);
+        return lastLine > lastEdited ? lastLine + growth : lastNotBlank(std::min(lineStop, line + added + 1), isBlank);
     };
     lastLine_ = follow(lastLine_, lineCount_);
-    const bool isSamePart = stop() == (stopBefore > behind ? stopBefore + growth : stopBefore) &&
-                            (stopBefore <= line || stopBefore > behind);
+    const bool isSamePart = stop() == (stopBefore > lastEdited ? stopBefore + growth : stopBefore) &&
+                            (stopBefore <= line || stopBefore > lastEdited);
     if (!isSamePart) {
         lastCounted_ = lastNotBlank(std::min(stop(), lastLine_ + 1), isBlank);
-    } else if (stopBefore > behind) {
+    } else if (stopBefore > lastEdited) {
         lastCounted_ = follow(lastCounted_, stop());
     }
 }

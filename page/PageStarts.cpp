@@ -54,7 +54,7 @@ PageStarts::Piece PageStarts::Piece::of(QStringView text)
 
 bool PageStarts::Record::bringsPages() const
 {
-    // A line end alone, or a character, is what anybody types anywhere.
+    // A line end alone, or a character, is typed anywhere.
     return inserted.length == 0 &&
            (removed.length > 2 || std::any_of(before.begin(), before.end(),
                                               [this](qint64 offset) { return offset > 0 && offset < removed.length; }));
@@ -128,7 +128,7 @@ PageStarts::Edit PageStarts::prepare(qint64 at, qint64 removed, QStringView remo
     edit.removed = isSeen ? changed.removed.size() : removed;
     edit.growth = inserted.size() - removed;
 
-    // Starts beside what differs keep their places in the text.
+    // Starts next to what differs keep their places in the text.
     const qint64 end = edit.at + edit.removed;
     Record record;
     record.at = edit.at;
@@ -193,11 +193,11 @@ void PageStarts::carry(Record &record, qint64 removed, QStringView inserted)
 void PageStarts::carryOut(Edit &&edit) noexcept
 {
     const auto begin = positions_.begin() + static_cast<std::ptrdiff_t>(edit.first);
-    const auto behind = positions_.erase(begin, positions_.begin() + static_cast<std::ptrdiff_t>(edit.last));
-    for (auto start = behind; start != positions_.end(); ++start) {
+    const auto next = positions_.erase(begin, positions_.begin() + static_cast<std::ptrdiff_t>(edit.last));
+    for (auto start = next; start != positions_.end(); ++start) {
         *start += edit.growth;
     }
-    positions_.insert(behind, edit.middle.begin(), edit.middle.end());
+    positions_.insert(next, edit.middle.begin(), edit.middle.end());
 
     // The places of earlier edits move as well. Those at the place of an inverse are where they were before its edit.
     const qint64 end = edit.at + edit.removed;

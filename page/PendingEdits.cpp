@@ -33,7 +33,7 @@ void PendingEdits::replaceInEdits(qint64 at, qint64 removed, QStringView inserte
         return;
     }
 
-    // Several edits, or text beside them, become one.
+    // Several edits, and the text next to them, become one.
     auto last = first;
     qint64 lastStart = firstStart;
     for (auto next = last + 1; next != edits_.end(); ++next) {
@@ -46,9 +46,9 @@ void PendingEdits::replaceInEdits(qint64 at, qint64 removed, QStringView inserte
     }
     const qint64 lastEnd = lastStart + last->inserted.size();
     const qint64 before = std::max<qint64>(0, firstStart - at);
-    const qint64 behind = std::max<qint64>(0, end - lastEnd);
+    const qint64 tail = std::max<qint64>(0, end - lastEnd);
     Edit merged{first->at - before, 0, first->inserted.first(std::max<qint64>(0, at - firstStart))};
-    merged.removed = last->at + last->removed + behind - merged.at;
+    merged.removed = last->at + last->removed + tail - merged.at;
     merged.inserted += inserted;
     merged.inserted += QStringView(last->inserted).last(std::max<qint64>(0, lastEnd - end));
     *first = std::move(merged);

@@ -18,7 +18,7 @@ namespace
 
 constexpr qint64 blockSize = 1 << 16;
 
-/// A PDF ends with this; one whose writing has failed does not.
+/// A complete PDF ends with this.
 bool isWhole(QFile &pdf)
 {
     const QByteArray mark("%%EOF");
@@ -73,7 +73,7 @@ bool PrintTarget::commit()
     QFile pages(printer_.outputFileName());
     bool done = false;
     if (!pages.open(QIODevice::ReadOnly) || !isWhole(pages)) {
-        error_ = Xlate("There is no room left for the pages.");
+        error_ = Xlate("There is not enough room for the pages on the disk.");
     } else {
         done = replaceFile(
             file_, [&pages](QIODevice &device) { return copyTo(device, pages); }, &error_);

@@ -31,7 +31,7 @@ qsizetype ScanText::sourceOf(qsizetype position) const
     if (runs_.empty()) {
         return 0;
     }
-    // The end belongs to the run of the last character, also where a cut left an empty run behind it.
+    // The end belongs to the run of the last character, also where a cut left an empty run after it.
     const Run &run = runs_[runAt(position == text_.size() && position > 0 ? position - 1 : position)];
     return run.source + (position - run.at);
 }
@@ -52,16 +52,16 @@ ScanText ScanText::sliced(qsizetype from, qsizetype count) const
 
 void ScanText::removeRuns(qsizetype from, qsizetype count)
 {
-    const qsizetype behind = from + count;
+    const qsizetype stop = from + count;
     const auto firstGone = std::lower_bound(runs_.begin(), runs_.end(), from,
                                             [](const Run &run, qsizetype wanted) { return run.at < wanted; });
-    if (behind >= size()) {
+    if (stop >= size()) {
         // With nothing left at all, the first run says where the text stood.
         runs_.erase(firstGone == runs_.begin() ? firstGone + 1 : firstGone, runs_.end());
         return;
     }
-    const auto last = runs_.begin() + static_cast<std::ptrdiff_t>(runAt(behind));
-    const Run rest = {from, last->source + (behind - last->at)};
+    const auto last = runs_.begin() + static_cast<std::ptrdiff_t>(runAt(stop));
+    const Run rest = {from, last->source + (stop - last->at)};
     for (auto run = last + 1; run != runs_.end(); ++run) {
         run->at -= count;
     }

@@ -94,17 +94,17 @@ ScanElement elementBetween(const ScanText &text, QStringView tag, qsizetype open
     return element;
 }
 
-/// What goes with a short closing tag when its element is cut out.
+/// What is removed with a short closing tag when its element is cut out.
 void noteDropped(const ScanText &text, QStringView tag, qsizetype close, ScanNotes *notes)
 {
     const QStringView view = text.view();
     if (notes == nullptr || !shortClosing.standsAt(view, close)) {
         return;
     }
-    const qsizetype behind = close + shortClosing.size();
-    const QStringView dropped = view.sliced(behind).first(std::min(tag.size(), view.size() - behind));
+    const qsizetype stop = close + shortClosing.size();
+    const QStringView dropped = view.sliced(stop).first(std::min(tag.size(), view.size() - stop));
     if (!dropped.trimmed().isEmpty()) {
-        note(notes, ScanNote::Kind::ShortCloseDrops, tag, text.sourceOf(behind), dropped.toString());
+        note(notes, ScanNote::Kind::ShortCloseDrops, tag, text.sourceOf(stop), dropped.toString());
     }
 }
 
@@ -144,8 +144,8 @@ ScanElement ExtractNode(ScanText &text, QStringView tag, bool remove, ScanNotes 
     ScanElement element = elementBetween(text, tag, found->open, found->value, found->close, notes);
     if (remove) {
         noteDropped(text, tag, found->close, notes);
-        const qsizetype behind = std::min(found->close + closing(tag).size(), text.size());
-        text.remove(found->open, behind - found->open);
+        const qsizetype stop = std::min(found->close + closing(tag).size(), text.size());
+        text.remove(found->open, stop - found->open);
     }
     return element;
 }

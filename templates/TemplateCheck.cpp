@@ -3,7 +3,7 @@
 #include "FieldMarker.h"
 #include "LeadingInteger.h"
 #include "MemoryLasts.h"
-#include "StandardText.h"
+#include "ScanNoteText.h"
 #include "TagLint.h"
 #include "TemplateElements.h"
 #include "TemplateRecords.h"
@@ -23,40 +23,6 @@ namespace kareport
 
 namespace
 {
-
-QString bracketed(QStringView tag)
-{
-    return u'<' + elementName(tag) + u'>';
-}
-
-/// A value for a message, cut short.
-QString quoted(const ScanElement &element)
-{
-    constexpr qsizetype longestQuote = 60;
-    const QString &text = element.value.text();
-    return u'"' + (text.size() > longestQuote ? text.left(longestQuote) + u'…' : text) + u'"';
-}
-
-bool isError(const ScanNote &note)
-{
-    return note.kind != ScanNote::Kind::ShortCloseDrops;
-}
-
-QString textOf(const ScanNote &note)
-{
-    const QString tag = bracketed(note.tag);
-    switch (note.kind) {
-    case ScanNote::Kind::EmptyEndsList:
-        return Xlate("an empty %1 ends its list: what follows in the list is not read").arg(tag);
-    case ScanNote::Kind::ClosedBeforeOpen:
-        return Xlate("%1 is not read: a closing tag of that name stands before it").arg(tag);
-    case ScanNote::Kind::Unclosed: return Xlate("%1 is not read: its closing tag was expected").arg(tag);
-    case ScanNote::Kind::RunsOn:
-        return Xlate("%1 stands in another %1: the outer one is cut short at the first closing tag").arg(tag);
-    case ScanNote::Kind::ShortCloseDrops: break;
-    }
-    return Xlate("\"%1\" is dropped with the short closing tag of %2").arg(note.text, tag);
-}
 
 using Names = std::unordered_set<QString>; ///< folded
 
@@ -84,7 +50,7 @@ private:
     TextPlaces places_;
     ScanText scan_;
     ScanNotes notes_;
-    std::unordered_map<QString, Names> variables_; ///< of the template at hand, by the dictionary's folded name
+    std::unordered_map<QString, Names> variables_; ///< of the current template, by the dictionary's folded name
     std::vector<TemplateRemark> remarks_;
 };
 
@@ -110,9 +76,9 @@ void Checker::checkTags()
 {
     for (const TagRemark &remark : findIgnoredTags(scan_)) {
         if (remark.kind == TagRemark::Kind::InComment) {
-            warning(remark.source, Xlate("%1 is read although it stands in a comment").arg(remark.text));
+            warning(remark.source, Xlate("%1 is read although it is in a comment").arg(remark.text));
         } else {
-            error(remark.source, Xlate("%1 is no tag: a tag has no blanks and no attributes").arg(remark.text));
+            error(remark.source, Xlate("%1 is not a tag: a tag has no blanks and no attributes").arg(remark.text));
         }
     }
 }
@@ -122,14 +88,14 @@ void Checker::checkNames(const std::vector<TemplateElement> &templates)
     Names names;
     for (const TemplateElement &element : templates) {
         if (element.name.value.isEmpty()) {
-            error(element.body.source, Xlate("the template has no <Name>, so nobody can choose it"));
+            error(element.body.source, Xlate("the template has no <Name>, so it cannot be chosen"));
             continue;
         }
         const QString key = foldedKey(element.name.value.view());
         if (names.contains(key)) {
-            warning(
-                element.name.source,
-                Xlate("a template named %1 stands before: the last one of a name is read").arg(quoted(element.name)));
+            warning(element.name.source,
+                    Xlate("a template named %1 comes before this one: the last one of a name is read")
+                        .arg(quotedValue(element.name)));
         }
         names.insert(key);
     }
@@ -141,9 +107,8 @@ void Checker::checkTemplate(const TemplateElement &element)
     for (const auto *tag : {u"TABLES", u"BLOCKS"}) {
         const ScanElement list = GetNode(body, tag);
         if (list.exists() && element.name.source > list.source) {
-            error(
-                element.name.source,
-                Xlate("the template's own <Name> must stand before %1: this one was taken for it").arg(bracketed(tag)));
+            error(element.name.source, Xlate("the template's own <Name> must come before %1: this one was taken for it")
+                                           .arg(bracketedTag(tag)));
             break;
         }
     }
@@ -163,8 +128,9 @@ void Checker::checkTemplate(const TemplateElement &element)
         const auto known = variables_.find(foldedKey(sort.use.value.view()));
         for (const ScanElement &name : sort.variableNames) {
             if (known != variables_.end() && !known->second.contains(foldedKey(name.value.view()))) {
-                error(name.source,
-                      Xlate("the sort key %1 is not in the dictionary %2").arg(quoted(name), quoted(sort.use)));
+                error(
+                    name.source,
+                    Xlate("the sort key %1 is not in the dictionary %2").arg(quotedValue(name), quotedValue(sort.use)));
             }
         }
     }
@@ -172,7 +138,7 @@ void Checker::checkTemplate(const TemplateElement &element)
     const OptionElements options = readOptionElements(body, &notes_);
     if (!options.separator.exists() || options.separator.value.isEmpty()) {
         warning(options.options.exists() ? options.options.source : element.body.source,
-                Xlate("no <Separator>: the character 0 stands between the columns"));
+                Xlate("no <Separator>: the columns are separated by the character 0"));
     }
 }
 
@@ -195,26 +161,27 @@ void Checker::checkVariables(const DictionaryElement &dictionary)
         if (!variableTypeFromKeyword(variable.type.value.view())) {
             error(variable.type.exists() ? variable.type.source : variable.element.source,
                   Xlate("unknown type %1: the variable %2 is left out")
-                      .arg(quoted(variable.type), quoted(variable.variableName)));
+                      .arg(quotedValue(variable.type), quotedValue(variable.variableName)));
             continue;
         }
         const qint32 id = leadingInteger(variable.id.value.view());
         if (variable.id.value.text() != QString::number(id)) {
             warning(variable.id.exists() ? variable.id.source : variable.element.source,
                     Xlate("the identifier %1 counts as %2: a whole number was expected")
-                        .arg(quoted(variable.id), QString::number(id)));
+                        .arg(quotedValue(variable.id), QString::number(id)));
         }
         const QString key = foldedKey(variable.variableName.value.view());
         if (known.contains(key)) {
             warning(variable.variableName.source,
-                    Xlate("the variable %1 stands twice in the dictionary: the last one counts")
-                        .arg(quoted(variable.variableName)));
+                    Xlate("the variable %1 is in the dictionary twice: the last one counts")
+                        .arg(quotedValue(variable.variableName)));
         } else if (ids.contains(id)) {
-            warning(variable.element.source, Xlate("the variables %1 and %2 share the identifier %3")
-                                                 .arg(ids.at(id), quoted(variable.variableName), QString::number(id)));
+            warning(variable.element.source,
+                    Xlate("the variables %1 and %2 share the identifier %3")
+                        .arg(ids.at(id), quotedValue(variable.variableName), QString::number(id)));
         }
         known.insert(key);
-        ids.insert_or_assign(id, quoted(variable.variableName));
+        ids.insert_or_assign(id, quotedValue(variable.variableName));
     }
 }
 
@@ -227,10 +194,10 @@ void Checker::checkOutput(const OutputElement &output, bool isTable)
     if (!hasDictionary) {
         const qsizetype source = output.use.exists() ? output.use.source : output.element.source;
         error(source, Xlate("there is no dictionary named %1: %2 cannot be written")
-                          .arg(quoted(output.use), quoted(output.name)));
+                          .arg(quotedValue(output.use), quotedValue(output.name)));
     }
     if (output.fields.empty()) {
-        warning(output.element.source, Xlate("%1 has no fields").arg(quoted(output.name)));
+        warning(output.element.source, Xlate("%1 has no fields").arg(quotedValue(output.name)));
     }
     const Names *variables = hasDictionary ? &variables_.at(foldedKey(output.use.value.view())) : nullptr;
     for (const FieldElement &field : output.fields) {
@@ -245,26 +212,26 @@ void Checker::checkField(const FieldElement &field, const Names *variables, bool
     const FieldMarker marker = fieldMarker(name.value.view());
     if (marker == FieldMarker::None && variables != nullptr && !variables->contains(foldedKey(name.value.view()))) {
         error(source,
-              isTable
-                  ? Xlate("the dictionary has no variable %1: the column cannot be filled").arg(quoted(name))
-                  : Xlate("the dictionary has no variable %1: the line repeats the value before it").arg(quoted(name)));
+              isTable ? Xlate("the dictionary has no variable %1: the column cannot be filled").arg(quotedValue(name))
+                      : Xlate("the dictionary has no variable %1: the line repeats the value before it")
+                            .arg(quotedValue(name)));
     }
     const FieldFormat format = parseFieldFormat(field.format.value.view());
     const qsizetype formatSource = field.format.exists() ? field.format.source : field.element.source;
     if (format.width > widestColumn || format.width < -widestColumn || format.decimals > widestColumn) {
-        error(formatSource,
-              Xlate("the format %1 is beyond %2 characters").arg(quoted(field.format), QString::number(widestColumn)));
+        error(formatSource, Xlate("the format %1 is beyond %2 characters")
+                                .arg(quotedValue(field.format), QString::number(widestColumn)));
     }
     const qsizetype labelSize = field.label.value.size();
     if (isTable && field.format.exists() && labelSize > std::max(format.width, 0)) {
         warning(field.label.source, Xlate("the label %1 is wider than its column of %2: the column takes its width")
-                                        .arg(quoted(field.label), QString::number(format.width)));
+                                        .arg(quotedValue(field.label), QString::number(format.width)));
     }
     const QStringView align = field.align.value.view();
     if (!align.isEmpty() && !equalFolded(align, u"LEFT") && !equalFolded(align, u"RIGHT") &&
         !(isTable && equalFolded(align, u"CENTER")))
     {
-        warning(field.align.source, Xlate("the alignment %1 counts as LEFT").arg(quoted(field.align)));
+        warning(field.align.source, Xlate("the alignment %1 counts as LEFT").arg(quotedValue(field.align)));
     }
     checkText(field.label);
 }
@@ -274,7 +241,7 @@ void Checker::checkText(const ScanElement &element)
     for (const auto *entity : {u"&amp;", u"&lt;", u"&gt;", u"&quot;", u"&apos;", u"&#", u"<![CDATA["}) {
         const qsizetype at = element.value.view().indexOf(entity);
         if (at >= 0) {
-            warning(element.value.sourceOf(at), Xlate("%1 is printed as it stands").arg(entity));
+            warning(element.value.sourceOf(at), Xlate("%1 is printed unchanged").arg(entity));
         }
     }
 }
@@ -282,7 +249,7 @@ void Checker::checkText(const ScanElement &element)
 void Checker::addNotes()
 {
     for (const ScanNote &note : notes_) {
-        remarks_.push_back({places_.of(note.source), isError(note), textOf(note)});
+        remarks_.push_back({places_.of(note.source), isScanError(note), scanNoteText(note)});
     }
 }
 
@@ -291,8 +258,8 @@ std::optional<TemplateRemark> firstUnread(const TemplateFile &file)
     ScanNotes notes;
     readTemplateElements(file.scanText(), &notes);
     for (const ScanNote &note : notes) {
-        if (note.tag == u"REPORTTEMPLATE" && isError(note)) {
-            return TemplateRemark{TextPlaces(file.text()).of(note.source), true, textOf(note)};
+        if (note.tag == u"REPORTTEMPLATE" && isScanError(note)) {
+            return TemplateRemark{TextPlaces(file.text()).of(note.source), true, scanNoteText(note)};
         }
     }
     return std::nullopt;

@@ -5,7 +5,7 @@
     <name>KaReport</name>
     <message>
         <location filename="../host/app/LinkTargetPosix.cpp"/>
-        <source>the link "%1" belongs to another user and stands in a folder that everybody can write to</source>
+        <source>the link "%1" belongs to another user and is in a folder that everybody can write to</source>
         <translation>Die Verknüpfung „%1“ gehört einem anderen Benutzer und steht in einem Ordner, in den jeder schreiben kann</translation>
     </message>
     <message>
@@ -44,27 +44,27 @@
         <translation>Unbenannt</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/ScanNoteText.cpp"/>
         <source>an empty %1 ends its list: what follows in the list is not read</source>
         <translation>ein leeres %1 beendet seine Liste: was in der Liste folgt, wird nicht gelesen</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
-        <source>%1 is not read: a closing tag of that name stands before it</source>
+        <location filename="../templates/ScanNoteText.cpp"/>
+        <source>%1 is not read: a closing tag of that name comes before it</source>
         <translation>%1 wird nicht gelesen: davor steht ein schließendes Tag dieses Namens</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/ScanNoteText.cpp"/>
         <source>%1 is not read: its closing tag was expected</source>
         <translation>%1 wird nicht gelesen: das schließende Tag dazu wurde erwartet</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
-        <source>%1 stands in another %1: the outer one is cut short at the first closing tag</source>
+        <location filename="../templates/ScanNoteText.cpp"/>
+        <source>%1 is inside another %1: the outer one ends at the first closing tag</source>
         <translation>%1 steht in einem anderen %1: das äußere endet schon beim ersten schließenden Tag</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/ScanNoteText.cpp"/>
         <source>"%1" is dropped with the short closing tag of %2</source>
         <translation>„%1“ entfällt mit dem verkürzten schließenden Tag von %2</translation>
     </message>
@@ -75,27 +75,27 @@
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
-        <source>%1 is read although it stands in a comment</source>
+        <source>%1 is read although it is in a comment</source>
         <translation>%1 wird gelesen, obwohl es in einem Kommentar steht</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
-        <source>%1 is no tag: a tag has no blanks and no attributes</source>
+        <source>%1 is not a tag: a tag has no blanks and no attributes</source>
         <translation>%1 ist kein Tag: ein Tag hat weder Leerzeichen noch Attribute</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
-        <source>the template has no &lt;Name&gt;, so nobody can choose it</source>
+        <source>the template has no &lt;Name&gt;, so it cannot be chosen</source>
         <translation>die Vorlage hat keinen &lt;Name&gt; und kann daher nicht gewählt werden</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
-        <source>a template named %1 stands before: the last one of a name is read</source>
+        <source>a template named %1 comes before this one: the last one of a name is read</source>
         <translation>eine Vorlage namens %1 steht schon davor: von gleichnamigen wird die letzte gelesen</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
-        <source>the template's own &lt;Name&gt; must stand before %1: this one was taken for it</source>
+        <source>the template's own &lt;Name&gt; must come before %1: this one was taken for it</source>
         <translation>der eigene &lt;Name&gt; der Vorlage muss vor %1 stehen: dieser hier wurde dafür gehalten</translation>
     </message>
     <message>
@@ -105,7 +105,7 @@
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
-        <source>no &lt;Separator&gt;: the character 0 stands between the columns</source>
+        <source>no &lt;Separator&gt;: the columns are separated by the character 0</source>
         <translation>kein &lt;Separator&gt;: zwischen den Spalten steht das Zeichen mit dem Code 0</translation>
     </message>
     <message>
@@ -125,7 +125,7 @@
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
-        <source>the variable %1 stands twice in the dictionary: the last one counts</source>
+        <source>the variable %1 is in the dictionary twice: the last one counts</source>
         <translation>die Variable %1 steht zweimal im Wörterbuch: die letzte gilt</translation>
     </message>
     <message>
@@ -180,7 +180,7 @@
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
-        <source>%1 is printed as it stands</source>
+        <source>%1 is printed unchanged</source>
         <translation>%1 wird unverändert gedruckt</translation>
     </message>
     <message>
@@ -235,7 +235,7 @@
     </message>
     <message>
         <location filename="../formats/pdf/PdfNotes.cpp"/>
-        <source>%1 wider than the page in type of %2 points: what is too wide goes on below</source>
+        <source>%1 wider than the page in type of %2 points: what is too wide continues below</source>
         <translation>%1 auch bei %2 Punkt breiter als die Seite: was zu breit ist, steht darunter</translation>
     </message>
     <message>
@@ -250,7 +250,7 @@
     </message>
     <message>
         <location filename="../formats/richtext/RichTextParser.cpp"/>
-        <source>%1 bytes of data were expected behind \bin</source>
+        <source>%1 bytes of data were expected after \bin</source>
         <translation>%1 Byte Daten wurden hinter \bin erwartet</translation>
     </message>
     <message>
@@ -260,12 +260,12 @@
     </message>
     <message>
         <location filename="../formats/richtext/RichTextParser.cpp"/>
-        <source>at most %1 groups inside each other were expected</source>
+        <source>at most %1 nested groups were expected</source>
         <translation>höchstens %1 ineinander geschachtelte Gruppen wurden erwartet</translation>
     </message>
     <message>
         <location filename="../formats/richtext/RichTextReader.cpp"/>
-        <source>%1 was expected, with which a rich text begins</source>
+        <source>a rich text that begins with %1 was expected</source>
         <translation>%1 wurde erwartet, womit Rich-Text beginnt</translation>
     </message>
     <message>
@@ -501,7 +501,7 @@
     </message>
     <message>
         <location filename="../print/PrintTarget.cpp"/>
-        <source>There is no room left for the pages.</source>
+        <source>There is not enough room for the pages on the disk.</source>
         <translation>Für die Seiten ist kein Speicherplatz mehr frei.</translation>
     </message>
     <message>
@@ -2123,7 +2123,7 @@
     </message>
     <message>
         <location filename="../apps/kareport/CommandOutputs.cpp"/>
-        <source>kareport: the report is empty, and a PDF has a page at least: "%1" was not written</source>
+        <source>kareport: the report is empty, and a PDF has at least one page: "%1" was not written</source>
         <translation>kareport: Der Bericht ist leer, und eine PDF-Datei hat mindestens eine Seite: „%1“ wurde nicht geschrieben</translation>
     </message>
     <message>
@@ -2153,12 +2153,12 @@
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
-        <source>the output "%1" is the report that is read: another one was expected</source>
+        <source>the output "%1" is the report being read: another file was expected</source>
         <translation>Die Ausgabe „%1“ ist der Bericht, der gelesen wird: eine andere wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
-        <source>--set "%1": a key of the page was expected, as page.linesPerPage=60</source>
+        <source>--set "%1": a key of the page was expected, such as page.linesPerPage=60</source>
         <translation>--set "%1": ein Schlüssel der Seite wurde erwartet, etwa page.linesPerPage=60</translation>
     </message>
     <message>
@@ -2193,7 +2193,7 @@
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>
-        <source>kareport: there was no job to make</source>
+        <source>kareport: there was no job to run</source>
         <translation>kareport: es gab keinen Auftrag auszuführen</translation>
     </message>
     <message>
@@ -2218,7 +2218,7 @@
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
-        <source>--limit "%1": a number of bytes was expected, as in 500000, 800K, 20M or 1G</source>
+        <source>--limit "%1": a number of bytes was expected, such as 500000, 800K, 20M or 1G</source>
         <translation>--limit „%1“: eine Zahl von Bytes wurde erwartet, wie 500000, 800K, 20M oder 1G</translation>
     </message>
     <message>
@@ -2238,12 +2238,12 @@
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
-        <source>--slice takes a part of several job files: these were expected</source>
+        <source>--slice takes a part of several job files: job files were expected</source>
         <translation>--slice nimmt einen Teil mehrerer Auftragsdateien: diese wurden erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
-        <source>--slice "%1": a number, a slash and the count of slices were expected, as in 3/8</source>
+        <source>--slice "%1": a number, a slash and the count of slices were expected, such as 3/8</source>
         <translation>--slice "%1": eine Zahl, ein Schrägstrich und die Anzahl der Teile wurden erwartet, wie in 3/8</translation>
     </message>
     <message>
@@ -2293,34 +2293,6 @@
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>"%1" was opened, but not all of it is shown:
-
-%2</source>
-        <translation>„%1“ wurde geöffnet, aber nicht alles daraus wird angezeigt:
-
-%2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>The report was made. Notes on its data: %1
-
-%2</source>
-        <translation>Der Bericht wurde erstellt. Hinweise zu seinen Daten: %1
-
-%2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>"%1" could not be opened.</source>
-        <translation>„%1“ konnte nicht geöffnet werden.</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>"%1" could not be opened: %2</source>
-        <translation>„%1“ konnte nicht geöffnet werden: %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>Open a job or a saved report, or drop it here.</source>
         <translation>Auftrag oder gespeicherten Bericht öffnen oder hierher ziehen.</translation>
     </message>
@@ -2341,57 +2313,6 @@
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>These reports could not be opened again:
-
-%1</source>
-        <translation>Diese Berichte konnten nicht wieder geöffnet werden:
-
-%1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>Their changes that were not saved are kept, and are offered again at the next start.</source>
-        <translation>Ihre nicht gespeicherten Änderungen sind aufbewahrt und werden beim nächsten Start wieder angeboten.</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>KaReport did not end properly, and what it had open cannot be read. These folders are left as they are:
-
-%1</source>
-        <translation>KaReport wurde nicht ordentlich beendet, und was offen war, ist nicht lesbar. Diese Ordner bleiben, wie sie sind:
-
-%1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source> (with changes that were not saved)</source>
-        <translation> (mit nicht gespeicherten Änderungen)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>KaReport did not end properly the last time. These reports were open:
-
-%1
-
-Open them again?</source>
-        <translation>KaReport wurde beim letzten Mal nicht ordnungsgemäß beendet. Diese Berichte waren geöffnet:
-
-%1
-
-Sollen sie wieder geöffnet werden?</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>"%1" was changed by another program, and it has changes here that are not saved. Load it again and lose the changes made here?</source>
-        <translation>„%1“ wurde von einem anderen Programm geändert, und hier gibt es Änderungen, die nicht gespeichert sind. Neu laden und die hier gemachten Änderungen verwerfen?</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>"%1" was changed by another program. Load it again?</source>
-        <translation>„%1“ wurde von einem anderen Programm geändert. Neu laden?</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>KaReport: fixed-pitch reports for civil engineering and surveying.
 
 Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and print it. Ctrl+F finds text, Ctrl+G goes to a page, Ctrl+wheel zooms.</source>
@@ -2403,6 +2324,44 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>About KaReport</source>
         <translation>Über KaReport</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
+        <source>"%1" could not be opened.</source>
+        <translation>„%1“ konnte nicht geöffnet werden.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
+        <source>"%1" could not be opened: %2</source>
+        <translation>„%1“ konnte nicht geöffnet werden: %2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
+        <source>The report was made. Notes on its data: %1
+
+%2</source>
+        <translation>Der Bericht wurde erstellt. Hinweise zu seinen Daten: %1
+
+%2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
+        <source>"%1" was opened, but not all of it is shown:
+
+%2</source>
+        <translation>„%1“ wurde geöffnet, aber nicht alles daraus wird angezeigt:
+
+%2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
+        <source>"%1" was changed by another program, and it has unsaved changes here. Load it again and lose the changes made here?</source>
+        <translation>„%1“ wurde von einem anderen Programm geändert, und hier gibt es Änderungen, die nicht gespeichert sind. Neu laden und die hier gemachten Änderungen verwerfen?</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
+        <source>"%1" was changed by another program. Load it again?</source>
+        <translation>„%1“ wurde von einem anderen Programm geändert. Neu laden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
@@ -2473,6 +2432,47 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Toolbar</source>
         <translation>Symbolleiste</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameRecovery.cpp"/>
+        <source>These reports could not be opened again:
+
+%1</source>
+        <translation>Diese Berichte konnten nicht wieder geöffnet werden:
+
+%1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameRecovery.cpp"/>
+        <source>Their unsaved changes are kept and will be offered again at the next start.</source>
+        <translation>Ihre nicht gespeicherten Änderungen sind aufbewahrt und werden beim nächsten Start wieder angeboten.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameRecovery.cpp"/>
+        <source>KaReport did not end properly, and what it had open cannot be read. These folders were not changed:
+
+%1</source>
+        <translation>KaReport wurde nicht ordentlich beendet, und was offen war, ist nicht lesbar. Diese Ordner bleiben, wie sie sind:
+
+%1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameRecovery.cpp"/>
+        <source> (with unsaved changes)</source>
+        <translation> (mit nicht gespeicherten Änderungen)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameRecovery.cpp"/>
+        <source>KaReport did not end properly the last time. These reports were open:
+
+%1
+
+Open them again?</source>
+        <translation>KaReport wurde beim letzten Mal nicht ordnungsgemäß beendet. Diese Berichte waren geöffnet:
+
+%1
+
+Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorHold.cpp"/>
@@ -2546,13 +2546,18 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
-        <source>Another job is running. Wait for its end, or cancel it.</source>
+        <source>Another job is running. Wait until it has finished, or cancel it.</source>
         <translation>Ein anderer Auftrag läuft gerade. Sein Ende abwarten oder ihn abbrechen.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
         <source>There is not enough memory for this input.</source>
         <translation>Der Arbeitsspeicher reicht für diese Eingabe nicht aus.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/KeptReport.cpp"/>
+        <source>its saved copy no longer exists</source>
+        <translation>Was davon aufbewahrt wurde, ist nicht mehr vorhanden</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
@@ -2610,11 +2615,6 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
         <translation>Pro&amp;gramm</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/Recovery.cpp"/>
-        <source>what was kept of it is no longer there</source>
-        <translation>Was davon aufbewahrt wurde, ist nicht mehr vorhanden</translation>
-    </message>
-    <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
         <source>There is no folder "%1". Choose another one, or create it first.</source>
         <translation>Der Ordner „%1“ ist nicht vorhanden. Wählen Sie einen anderen, oder legen Sie ihn zuerst an.</translation>
@@ -2631,7 +2631,7 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
     </message>
     <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
-        <source>the report is empty, and a PDF has one page at least</source>
+        <source>the report is empty, and a PDF has at least one page</source>
         <translation>der Bericht ist leer, und eine PDF-Datei hat mindestens eine Seite</translation>
     </message>
     <message>

@@ -5,7 +5,7 @@
     <name>KaReport</name>
     <message>
         <location filename="../host/app/LinkTargetPosix.cpp"/>
-        <source>the link "%1" belongs to another user and stands in a folder that everybody can write to</source>
+        <source>the link "%1" belongs to another user and is in a folder that everybody can write to</source>
         <translation>リンク "%1" は別のユーザーのもので、だれでも書き込めるフォルダーにあります</translation>
     </message>
     <message>
@@ -44,27 +44,27 @@
         <translation>無題</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/ScanNoteText.cpp"/>
         <source>an empty %1 ends its list: what follows in the list is not read</source>
         <translation>空の %1 でリストが終わります: リスト内のこれ以降は読み込まれません</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
-        <source>%1 is not read: a closing tag of that name stands before it</source>
+        <location filename="../templates/ScanNoteText.cpp"/>
+        <source>%1 is not read: a closing tag of that name comes before it</source>
         <translation>%1 は読み込まれません: 同じ名前の終了タグが前にあります</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/ScanNoteText.cpp"/>
         <source>%1 is not read: its closing tag was expected</source>
         <translation>%1 は読み込まれません: 終了タグが必要です</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
-        <source>%1 stands in another %1: the outer one is cut short at the first closing tag</source>
+        <location filename="../templates/ScanNoteText.cpp"/>
+        <source>%1 is inside another %1: the outer one ends at the first closing tag</source>
         <translation>%1 が別の %1 の中にあります: 外側の要素は最初の終了タグで打ち切られます</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/ScanNoteText.cpp"/>
         <source>"%1" is dropped with the short closing tag of %2</source>
         <translation>「%1」は %2 の省略形の終了タグとともに無視されます</translation>
     </message>
@@ -75,27 +75,27 @@
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
-        <source>%1 is read although it stands in a comment</source>
+        <source>%1 is read although it is in a comment</source>
         <translation>%1 はコメント内にありますが、読み込まれます</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
-        <source>%1 is no tag: a tag has no blanks and no attributes</source>
+        <source>%1 is not a tag: a tag has no blanks and no attributes</source>
         <translation>%1 はタグではありません: タグに空白や属性は使えません</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
-        <source>the template has no &lt;Name&gt;, so nobody can choose it</source>
+        <source>the template has no &lt;Name&gt;, so it cannot be chosen</source>
         <translation>テンプレートに &lt;Name&gt; がないため、選択できません</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
-        <source>a template named %1 stands before: the last one of a name is read</source>
+        <source>a template named %1 comes before this one: the last one of a name is read</source>
         <translation>%1 という名前のテンプレートが前にもあります: 同名のものは最後の 1 つが読み込まれます</translation>
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
-        <source>the template's own &lt;Name&gt; must stand before %1: this one was taken for it</source>
+        <source>the template's own &lt;Name&gt; must come before %1: this one was taken for it</source>
         <translation>テンプレート自身の &lt;Name&gt; は %1 より前に必要です: この &lt;Name&gt; がテンプレート名とみなされました</translation>
     </message>
     <message>
@@ -105,7 +105,7 @@
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
-        <source>no &lt;Separator&gt;: the character 0 stands between the columns</source>
+        <source>no &lt;Separator&gt;: the columns are separated by the character 0</source>
         <translation>&lt;Separator&gt; がありません: 列の間には文字コード 0 の文字が入ります</translation>
     </message>
     <message>
@@ -125,7 +125,7 @@
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
-        <source>the variable %1 stands twice in the dictionary: the last one counts</source>
+        <source>the variable %1 is in the dictionary twice: the last one counts</source>
         <translation>変数 %1 が辞書に 2 回あります: 最後のものが有効です</translation>
     </message>
     <message>
@@ -180,7 +180,7 @@
     </message>
     <message>
         <location filename="../templates/TemplateCheck.cpp"/>
-        <source>%1 is printed as it stands</source>
+        <source>%1 is printed unchanged</source>
         <translation>%1 はそのまま印字されます</translation>
     </message>
     <message>
@@ -235,7 +235,7 @@
     </message>
     <message>
         <location filename="../formats/pdf/PdfNotes.cpp"/>
-        <source>%1 wider than the page in type of %2 points: what is too wide goes on below</source>
+        <source>%1 wider than the page in type of %2 points: what is too wide continues below</source>
         <translation>%1 %2 ポイントの文字でもページより幅が広いため、はみ出す部分は下の行に続きます</translation>
     </message>
     <message>
@@ -250,7 +250,7 @@
     </message>
     <message>
         <location filename="../formats/richtext/RichTextParser.cpp"/>
-        <source>%1 bytes of data were expected behind \bin</source>
+        <source>%1 bytes of data were expected after \bin</source>
         <translation>\bin の後に %1 バイトのデータが必要です</translation>
     </message>
     <message>
@@ -260,12 +260,12 @@
     </message>
     <message>
         <location filename="../formats/richtext/RichTextParser.cpp"/>
-        <source>at most %1 groups inside each other were expected</source>
+        <source>at most %1 nested groups were expected</source>
         <translation>グループの入れ子は %1 段以下である必要があります</translation>
     </message>
     <message>
         <location filename="../formats/richtext/RichTextReader.cpp"/>
-        <source>%1 was expected, with which a rich text begins</source>
+        <source>a rich text that begins with %1 was expected</source>
         <translation>リッチテキストの先頭には %1 が必要です</translation>
     </message>
     <message>
@@ -501,7 +501,7 @@
     </message>
     <message>
         <location filename="../print/PrintTarget.cpp"/>
-        <source>There is no room left for the pages.</source>
+        <source>There is not enough room for the pages on the disk.</source>
         <translation>ページを保存する空き容量がありません。</translation>
     </message>
     <message>
@@ -2123,7 +2123,7 @@
     </message>
     <message>
         <location filename="../apps/kareport/CommandOutputs.cpp"/>
-        <source>kareport: the report is empty, and a PDF has a page at least: "%1" was not written</source>
+        <source>kareport: the report is empty, and a PDF has at least one page: "%1" was not written</source>
         <translation>kareport: レポートが空です。PDF には少なくとも 1 ページが必要なため、「%1」は書き込まれませんでした</translation>
     </message>
     <message>
@@ -2153,12 +2153,12 @@
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
-        <source>the output "%1" is the report that is read: another one was expected</source>
+        <source>the output "%1" is the report being read: another file was expected</source>
         <translation>出力 "%1" は読み込むレポートそのものです: 別の出力が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
-        <source>--set "%1": a key of the page was expected, as page.linesPerPage=60</source>
+        <source>--set "%1": a key of the page was expected, such as page.linesPerPage=60</source>
         <translation>--set "%1": page.linesPerPage=60 のようなページのキーが必要です</translation>
     </message>
     <message>
@@ -2193,7 +2193,7 @@
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>
-        <source>kareport: there was no job to make</source>
+        <source>kareport: there was no job to run</source>
         <translation>kareport: 作成するジョブがありません</translation>
     </message>
     <message>
@@ -2218,7 +2218,7 @@
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
-        <source>--limit "%1": a number of bytes was expected, as in 500000, 800K, 20M or 1G</source>
+        <source>--limit "%1": a number of bytes was expected, such as 500000, 800K, 20M or 1G</source>
         <translation>--limit "%1": 500000、800K、20M、1G のようなバイト数が必要です</translation>
     </message>
     <message>
@@ -2238,12 +2238,12 @@
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
-        <source>--slice takes a part of several job files: these were expected</source>
+        <source>--slice takes a part of several job files: job files were expected</source>
         <translation>--slice は複数のジョブファイルの一部を選びます: ジョブファイルが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
-        <source>--slice "%1": a number, a slash and the count of slices were expected, as in 3/8</source>
+        <source>--slice "%1": a number, a slash and the count of slices were expected, such as 3/8</source>
         <translation>--slice "%1": 3/8 のように、番号、スラッシュ、分割数が必要です</translation>
     </message>
     <message>
@@ -2293,34 +2293,6 @@
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>"%1" was opened, but not all of it is shown:
-
-%2</source>
-        <translation>「%1」を開きましたが、表示されない内容があります:
-
-%2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>The report was made. Notes on its data: %1
-
-%2</source>
-        <translation>レポートを作成しました。データに関する注意: %1
-
-%2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>"%1" could not be opened.</source>
-        <translation>「%1」を開けませんでした。</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>"%1" could not be opened: %2</source>
-        <translation>「%1」を開けませんでした: %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>Open a job or a saved report, or drop it here.</source>
         <translation>ジョブまたは保存した帳票を開くか、ここにドロップしてください。</translation>
     </message>
@@ -2341,57 +2313,6 @@
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>These reports could not be opened again:
-
-%1</source>
-        <translation>次の帳票を開き直せませんでした:
-
-%1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>Their changes that were not saved are kept, and are offered again at the next start.</source>
-        <translation>保存されていない変更は残してあり、次回の起動時に再び確認します。</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>KaReport did not end properly, and what it had open cannot be read. These folders are left as they are:
-
-%1</source>
-        <translation>KaReportは正常に終了しませんでした。開いていたレポートの一覧を読み取れません。次のフォルダーはそのまま残します:
-
-%1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source> (with changes that were not saved)</source>
-        <translation> (未保存の変更あり)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>KaReport did not end properly the last time. These reports were open:
-
-%1
-
-Open them again?</source>
-        <translation>KaReport は前回正常に終了しませんでした。次の帳票が開かれていました:
-
-%1
-
-もう一度開きますか?</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>"%1" was changed by another program, and it has changes here that are not saved. Load it again and lose the changes made here?</source>
-        <translation>「%1」は別のプログラムで変更されましたが、ここにも未保存の変更があります。再読み込みして、ここでの変更を破棄しますか?</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>"%1" was changed by another program. Load it again?</source>
-        <translation>「%1」は別のプログラムで変更されました。再読み込みしますか?</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>KaReport: fixed-pitch reports for civil engineering and surveying.
 
 Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and print it. Ctrl+F finds text, Ctrl+G goes to a page, Ctrl+wheel zooms.</source>
@@ -2403,6 +2324,44 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>About KaReport</source>
         <translation>KaReport について</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
+        <source>"%1" could not be opened.</source>
+        <translation>「%1」を開けませんでした。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
+        <source>"%1" could not be opened: %2</source>
+        <translation>「%1」を開けませんでした: %2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
+        <source>The report was made. Notes on its data: %1
+
+%2</source>
+        <translation>レポートを作成しました。データに関する注意: %1
+
+%2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
+        <source>"%1" was opened, but not all of it is shown:
+
+%2</source>
+        <translation>「%1」を開きましたが、表示されない内容があります:
+
+%2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
+        <source>"%1" was changed by another program, and it has unsaved changes here. Load it again and lose the changes made here?</source>
+        <translation>「%1」は別のプログラムで変更されましたが、ここにも未保存の変更があります。再読み込みして、ここでの変更を破棄しますか?</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
+        <source>"%1" was changed by another program. Load it again?</source>
+        <translation>「%1」は別のプログラムで変更されました。再読み込みしますか?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
@@ -2473,6 +2432,47 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Toolbar</source>
         <translation>ツールバー</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameRecovery.cpp"/>
+        <source>These reports could not be opened again:
+
+%1</source>
+        <translation>次の帳票を開き直せませんでした:
+
+%1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameRecovery.cpp"/>
+        <source>Their unsaved changes are kept and will be offered again at the next start.</source>
+        <translation>保存されていない変更は残してあり、次回の起動時に再び確認します。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameRecovery.cpp"/>
+        <source>KaReport did not end properly, and what it had open cannot be read. These folders were not changed:
+
+%1</source>
+        <translation>KaReportは正常に終了しませんでした。開いていたレポートの一覧を読み取れません。次のフォルダーはそのまま残します:
+
+%1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameRecovery.cpp"/>
+        <source> (with unsaved changes)</source>
+        <translation> (未保存の変更あり)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameRecovery.cpp"/>
+        <source>KaReport did not end properly the last time. These reports were open:
+
+%1
+
+Open them again?</source>
+        <translation>KaReport は前回正常に終了しませんでした。次の帳票が開かれていました:
+
+%1
+
+もう一度開きますか?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/EditorHold.cpp"/>
@@ -2546,13 +2546,18 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
-        <source>Another job is running. Wait for its end, or cancel it.</source>
+        <source>Another job is running. Wait until it has finished, or cancel it.</source>
         <translation>別のジョブが実行中です。終了を待つか、中止してください。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
         <source>There is not enough memory for this input.</source>
         <translation>この入力を処理するメモリが足りません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/KeptReport.cpp"/>
+        <source>its saved copy no longer exists</source>
+        <translation>保管されていた内容が見つかりません</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
@@ -2610,11 +2615,6 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
         <translation>プログラム(&amp;G)</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/Recovery.cpp"/>
-        <source>what was kept of it is no longer there</source>
-        <translation>保管されていた内容が見つかりません</translation>
-    </message>
-    <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
         <source>There is no folder "%1". Choose another one, or create it first.</source>
         <translation>フォルダー「%1」がありません。別のフォルダーを選ぶか、先に作成してください。</translation>
@@ -2631,7 +2631,7 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
     </message>
     <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
-        <source>the report is empty, and a PDF has one page at least</source>
+        <source>the report is empty, and a PDF has at least one page</source>
         <translation>レポートが空です。PDFには少なくとも1ページ必要です</translation>
     </message>
     <message>

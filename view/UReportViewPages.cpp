@@ -107,10 +107,10 @@ bool UReportView::carryThrough(const ReportChange &change)
     const QString after = edit_->windowText();
     const QString inserted = change.documentInserted();
     const qint64 at = change.documentPosition();
-    const qint64 behind = at + change.documentRemoved();
-    const bool isOne = before.text.size() == change.documentLengthBefore() && behind <= before.text.size() &&
+    const qint64 stop = at + change.documentRemoved();
+    const bool isOne = before.text.size() == change.documentLengthBefore() && stop <= before.text.size() &&
                        QStringView(before.text).first(at) == QStringView(after).first(at) &&
-                       QStringView(before.text).sliced(behind) == QStringView(after).sliced(at + inserted.size());
+                       QStringView(before.text).sliced(stop) == QStringView(after).sliced(at + inserted.size());
     if (!isOne || report.HoldsRichTextSource()) {
         return false;
     }
@@ -128,12 +128,12 @@ std::optional<std::vector<qint64>> UReportView::startsAfter(const ReportChange &
     const QTextDocument &document = *edit_->document();
     const QString inserted = change.documentInserted();
     const qint64 at = change.documentPosition();
-    const qint64 behind = at + inserted.size();
+    const qint64 stop = at + inserted.size();
     const int lastRemoved = change.lineEndsBefore + change.lineEndsRemoved;
     const int growth = static_cast<int>(change.inserted.count(u'\n')) - change.lineEndsRemoved;
     const bool beginsLine = kareport::startOfBlock(document.findBlockByNumber(change.lineEndsBefore)) == at;
     // A line that is put in at a page's start is the page's before, and a page whose text before it is removed stays. A
-    // start that stands within a line then counts again when the line end comes back.
+    // start that is within a line then counts again when the line end comes back.
     const bool isPutBefore = change.removed == 0 && at > 0 && beginsLine && inserted.endsWith(u'\n');
     std::vector<qint64> starts;
     for (const int line : *lines) {
@@ -141,11 +141,11 @@ std::optional<std::vector<qint64>> UReportView::startsAfter(const ReportChange &
             starts.push_back(kareport::startOfBlock(document.findBlockByNumber(line + growth)));
         } else if (line > change.lineEndsBefore) {
             if (line == lastRemoved) {
-                starts.push_back(behind);
+                starts.push_back(stop);
             }
         } else {
             const qint64 start = kareport::startOfBlock(document.findBlockByNumber(line));
-            starts.push_back(start == at && isPutBefore ? behind : start);
+            starts.push_back(start == at && isPutBefore ? stop : start);
         }
     }
     for (const qint64 header : kareport::pageHeadersIn(inserted)) {

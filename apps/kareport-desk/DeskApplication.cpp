@@ -1,9 +1,12 @@
 #include "DeskApplication.h"
 
+#include "AppMessageBox.h"
 #include "CReportViewPane.h"
 #include "DeskFrame.h"
+#include "PlainWidgets.h"
 #include "Profile.h"
 #include "ReportEntry.h"
+#include "SaveAs.h"
 #include "UReportView.h"
 #include "WorkAside.h"
 
@@ -55,3 +58,16 @@ void DeskApplication::OnDocumentEvent(UDocument &document, UDocument::DocumentEv
         frame->NoteDocumentEvent(document, event);
     }
 }
+
+namespace kareport
+{
+
+void installDialogs(QWidget *parent)
+{
+    setMessageBox([parent](const Message &message) { return showMessageBox(parent, message); });
+    setSaveDialog([parent](const SaveRequest &request) {
+        return askOwnName(request, [parent](const SaveRequest &asked) { return askSavePath(parent, asked); });
+    });
+}
+
+} // namespace kareport

@@ -2,6 +2,8 @@
 
 #include "UApplication.h"
 
+class QWidget;
+
 /// The desktop program: its files last used are kept in the user's profile.
 class DeskApplication : public UApplication
 {
@@ -12,3 +14,11 @@ public:
     void AddToRecentFileList(const QString &path) override;
     void OnDocumentEvent(UDocument &document, UDocument::DocumentEvent event) override;
 };
+
+namespace kareport
+{
+
+/// Shows the program's messages and questions for file names as dialogs of a window.
+void installDialogs(QWidget *parent);
+
+} // namespace kareport

@@ -62,19 +62,21 @@ private:
     void open();
     void fromTemplate(const QString &templateFile);
     void askPreferences();
+    /// Shows what a file holds that its report does not show, if anything.
+    static void sayWhatIsNotShown(const QString &path, const kareport::ReadNotes &notes);
     bool finishOpening(UDocument *report, const QString &error);
     /// Runs a job, and says what there is to note on its report.
     bool openJob(const QString &path);
     /// The report of a file, which is opened where it is not open.
     UDocument *openReport(const QString &file, kareport::ReadNotes &notes);
-    /// Opens a report in whatever way, while its file counts as being opened: what changes in it meanwhile is told.
+    /// Opens a report by any means, while its file counts as being opened: what changes in it meanwhile is reported.
     UReportDoc *read(const QString &file, const std::function<UReportDoc *()> &open);
     /// Opens what a program that crashed had open. @return what could not be opened, and what the user did not wait for
     std::vector<kareport::KeptReport> reopen(const std::vector<kareport::KeptReport> &left);
     /// Brings a report to the front where it is shown, and shows it where it is not.
     void activate(UDocument *report);
-    /// Closes reports that nobody can see or close any more, as after their window was closed. One that has changes is shown
-    /// again, and so is one whose editor has been closed.
+    /// Closes reports that the user can no longer see or close, as after their window was closed. One that has changes
+    /// is shown again, and so is one whose editor has been closed.
     void closeUnseen();
     void fileChanged(const QString &path);
     void loadAgain(UReportDoc &report);

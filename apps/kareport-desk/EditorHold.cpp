@@ -16,13 +16,13 @@ namespace kareport
 
 namespace
 {
-constexpr int lookInterval = 500; // milliseconds
+constexpr int checkInterval = 500; // milliseconds
 } // namespace
 
 EditorHold::EditorHold()
 {
-    QObject::connect(&timer_, &QTimer::timeout, &timer_, [this] { look(); });
-    timer_.setInterval(lookInterval);
+    QObject::connect(&checkTimer_, &QTimer::timeout, &checkTimer_, [this] { checkPrograms(); });
+    checkTimer_.setInterval(checkInterval);
     setEditorLauncher([this](const EditorLaunch &launch) { start(launch); });
 }
 
@@ -37,7 +37,7 @@ void EditorHold::start(const EditorLaunch &launch)
     auto *report = dynamic_cast<UReportDoc *>(launch.document);
     if (!QProcess::startDetached(launch.program, {launch.file}, launch.folder, &process)) {
         unstarted_.push_back(report);
-        QTimer::singleShot(0, &timer_, [this, report, program = launch.program] { showInstead(report, program); });
+        QTimer::singleShot(0, &checkTimer_, [this, report, program = launch.program] { showInstead(report, program); });
         return;
     }
     if (report != nullptr) {
@@ -46,7 +46,7 @@ void EditorHold::start(const EditorLaunch &launch)
             report->EnableCloseOption(false);
         }
         held_.push_back({report, process, isKept});
-        timer_.start();
+        checkTimer_.start();
     }
 }
 
@@ -75,7 +75,7 @@ void EditorHold::forget(const UReportDoc *report)
     std::erase(unstarted_, report);
 }
 
-void EditorHold::look()
+void EditorHold::checkPrograms()
 {
     const auto ended = std::stable_partition(held_.begin(), held_.end(), [](const Held &held) {
         return isProcessRunning(held.process) && UReportDoc::IsReportAvailable(held.report);
@@ -92,7 +92,7 @@ void EditorHold::look()
         }
     }
     if (held_.empty()) {
-        timer_.stop();
+        checkTimer_.stop();
     }
 }
 

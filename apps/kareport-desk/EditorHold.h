@@ -22,10 +22,10 @@ public:
     EditorHold(const EditorHold &) = delete;
     EditorHold &operator=(const EditorHold &) = delete;
 
-    /// Whether a program that was started for a report still runs, or is about to be said not to have started. A report that
-    /// stands in one as a copy is held as long as any runs.
+    /// Whether a program that was started for a report still runs, or has failed to start and this is still to be
+    /// shown. A report that is open in one as a copy is held as long as any runs.
     bool holds(const UReportDoc &report) const;
-    /// A report has been closed: what comes in its place in memory is another one.
+    /// A report has been closed: a new report may get its address.
     void forget(const UReportDoc *report);
 
 private:
@@ -37,13 +37,13 @@ private:
     };
 
     void start(const EditorLaunch &launch);
-    void look();
+    void checkPrograms();
 
     void showInstead(UReportDoc *report, const QString &program);
 
     std::vector<Held> held_;
-    std::vector<const UReportDoc *> unstarted_; ///< whose editor could not be started, which is still to be said
-    QTimer timer_;
+    std::vector<const UReportDoc *> unstarted_; ///< whose editor could not be started, which is still to be reported
+    QTimer checkTimer_;
 };
 
 } // namespace kareport

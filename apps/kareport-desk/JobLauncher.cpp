@@ -80,7 +80,8 @@ UReportDoc *makeShown(bool header, const QString &caption)
     return report;
 }
 
-/// Which data file of a job is none: reading a pipe or a device might never end, and nothing could stop it.
+/// The data file of a job that is not a regular file: reading a pipe or a device might never end, and nothing could
+/// stop it.
 std::optional<InputError> dataThatIsNoFile(const Job &job, const JsonSource &source)
 {
     QStringList names = job.data.keys();
@@ -125,7 +126,7 @@ UReportDoc *makeReport(const Job &job, const JsonSource &source, QWidget *parent
         notes = runner.notes();
     } catch (const std::bad_alloc &) {
         endRichTextMode(report);
-        closeReport(report); // half a report is none
+        closeReport(report); // half a report counts as none
         throw;
     }
     if (wrong) {
@@ -164,7 +165,7 @@ template <typename Read>
 UReportDoc *launch(const Read &read, QWidget *parent, QString &error, JobNotes &notes)
 {
     if (runningJob()) {
-        error = Xlate("Another job is running. Wait for its end, or cancel it.");
+        error = Xlate("Another job is running. Wait until it has finished, or cancel it.");
         return nullptr;
     }
     const QScopedValueRollback<bool> running(runningJob(), true);

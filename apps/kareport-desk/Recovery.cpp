@@ -2,17 +2,14 @@
 
 #include "MemoryLasts.h"
 #include "ReportEntry.h"
-#include "ReportPages.h"
-#include "SavedReports.h"
 #include "SavedText.h"
-#include "TextFile.h"
 #include "UReportDoc.h"
 #include "UReportView.h"
 #include "UReportWindowDlg.h"
-#include "Xlate.h"
 
 #include <QDir>
 #include <QFile>
+#include <QFileInfo>
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonObject>
@@ -34,13 +31,6 @@ constexpr QFileDevice::Permissions onlyUser = QFileDevice::ReadOwner | QFileDevi
 const QString linesPerPageKey = QStringLiteral("linesPerPage");
 const QString pageLinesKey = QStringLiteral("pages");
 
-void fixPage(UReportDoc &report, const KeptReport &kept)
-{
-    if (kept.linesPerPage > 0) {
-        report.FixPage(kept.linesPerPage, std::nullopt);
-    }
-}
-
 /// The view whose formats are not in the report's text; null when there is none.
 const UReportView *formattedView(const UReportDoc &report)
 {
@@ -53,48 +43,17 @@ const UReportView *formattedView(const UReportDoc &report)
     return nullptr;
 }
 
-/// A text that a program kept.
-TextFile readText(const KeptReport &kept)
-{
-    if (!Recovery::holdsText(kept)) {
-        return {TextFile::State::NotRead, nullptr, Xlate("what was kept of it is no longer there")};
-    }
-    return readTextFile(kept.textFile, UserInput::Taken,
-                        [lines = kept.pageLines](QByteArrayView bytes, LoadedText &loaded, const auto &proceed) {
-                            const TextLoading answer = loadPlainText(bytes, loaded, proceed);
-                            if (answer == TextLoading::Whole && !lines.empty()) {
-                                loaded.pageStarts = loaded.text.isNarrow()
-                                                        ? startsOfLines(loaded.text.narrowView(), lines)
-                                                        : startsOfLines(loaded.text.view(), lines);
-                            }
-                            return answer;
-                        });
-}
-
-/// Gives a report the text that was kept of it. @return whether it has all of it
-bool fill(UReportDoc &report, const KeptReport &kept, LoadedText &text)
-{
-    report.TakeText(text);
-    fixPage(report, kept);
-    if (!kept.path.isEmpty() && !isPdfName(kept.path)) {
-        report.SetPathName(kept.path, false);
-    }
-    report.UpdateAllViews(nullptr, 0, nullptr);
-    report.SetModifiedFlag(true);
-    return !report.HasLostText();
-}
-
 /// Writes a report's text piece by piece: while a long one is written, the windows wait.
 bool writeAll(const UReportDoc &report, QIODevice &device)
 {
-    constexpr qint64 longestPiece = 128 * 1024; // characters
+    constexpr qint64 longestPiece = qint64(128) * 1024; // characters
     return whileMemoryLasts(false, [&] {
         QStringEncoder encode(QStringEncoder::Utf8);
         const qint64 length = report.GetTextLength();
         for (qint64 at = 0; at < length; at += longestPiece) {
             const QString piece = report.CopyText(at, longestPiece);
             const QByteArray bytes = encode(piece);
-            // Without memory for a copy there is none; what was kept before is worth more.
+            // A copy needs memory: without it, the earlier copy is kept.
             if (piece.size() != std::min(longestPiece, length - at) || device.write(bytes) != bytes.size()) {
                 return false;
             }
@@ -106,11 +65,11 @@ bool writeAll(const UReportDoc &report, QIODevice &device)
 std::vector<KeptReport> readList(const RecoveryFolder &folder)
 {
     std::vector<KeptReport> reports;
-    for (const QJsonValue &entry : folder.list().value_or(QJsonArray())) {
+    for (const QJsonValue entry : folder.list().value_or(QJsonArray())) {
         const QString text = entry[QStringLiteral("text")].toString();
         reports.push_back({entry[QStringLiteral("title")].toString(), entry[QStringLiteral("path")].toString(),
                            text.isEmpty() ? text : folder.textFile(text), entry[linesPerPageKey].toInt()});
-        for (const QJsonValue &line : entry[pageLinesKey].toArray()) {
+        for (const QJsonValue line : entry[pageLinesKey].toArray()) {
             reports.back().pageLines.push_back(line.toInteger());
         }
     }
@@ -122,14 +81,6 @@ std::vector<KeptReport> readList(const RecoveryFolder &folder)
 QString Recovery::usualFolder()
 {
     return QStandardPaths::writableLocation(QStandardPaths::AppLocalDataLocation) + QStringLiteral("/recovery");
-}
-
-QString KeptReport::name() const
-{
-    if (!title.isEmpty()) {
-        return title;
-    }
-    return path.isEmpty() ? Xlate("Untitled") : path;
 }
 
 Recovery::Recovery(const QString &folder)
@@ -159,8 +110,12 @@ Recovery::~Recovery()
 {
     if (lock_ && !folder_->isOurs()) {
         // Something else has taken the folder's name meanwhile: unlocking would remove its lock.
-        static auto *const left = new std::vector<QLockFile *>; // for as long as the program runs
-        left->push_back(lock_.release());
+        doneWhileMemoryLasts([this] {
+            // For as long as the program runs. NOLINTNEXTLINE(bugprone-unhandled-exception-at-new): it is handled here
+            static auto *const left = new std::vector<QLockFile *>;
+            left->push_back(lock_.get());
+        });
+        static_cast<void>(lock_.release());
     } else if (lock_) {
         folder_->removeFiles();
         lock_->unlock();
@@ -196,7 +151,7 @@ void Recovery::discardLeft(const std::vector<KeptReport> &lost)
 {
     const auto isKept = [&lost](const Left &left) {
         return std::any_of(lost.begin(), lost.end(), [&left](const KeptReport &kept) {
-            return QFileInfo(kept.textFile).path() == left.folder.path() && holdsText(kept);
+            return QFileInfo(kept.textFile).path() == left.folder.path() && kept.holdsText();
         });
     };
     for (const Left &left : left_) {
@@ -207,36 +162,6 @@ void Recovery::discardLeft(const std::vector<KeptReport> &lost)
         }
     }
     std::erase_if(left_, std::not_fn(isKept));
-}
-
-bool Recovery::holdsText(const KeptReport &kept)
-{
-    return !kept.textFile.isEmpty() && RecoveryFolder(QFileInfo(kept.textFile).path()).holdsText(kept.textFile);
-}
-
-UReportDoc *Recovery::reopen(const KeptReport &kept, ReadNotes *notes)
-{
-    if (kept.textFile.isEmpty()) {
-        UReportDoc *saved = openSavedReport(kept.path, notes);
-        if (saved != nullptr && !saved->IsPageFixed()) {
-            fixPage(*saved, kept);
-        }
-        return saved;
-    }
-    UReportDoc *report = nullptr;
-    const bool isWhole = whileMemoryLasts(false, [&] {
-        const TextFile read = readText(kept);
-        if (notes != nullptr) {
-            notes->isStopped = read.state == TextFile::State::Stopped;
-            notes->problem = read.problem;
-        }
-        report = read.text ? CreateReport(kept.title, true, false, nullptr, 0, nullptr) : nullptr;
-        return report != nullptr && fill(*report, kept, *read.text);
-    });
-    if (!isWhole && UReportDoc::IsReportAvailable(report)) {
-        report->OnCloseDocument(); // what is kept on the disk is all that there is
-    }
-    return isWhole ? report : nullptr;
 }
 
 QString Recovery::textFileOf(const UReportDoc &report)
@@ -301,7 +226,7 @@ bool Recovery::keep()
         }
         list.append(entry);
     }
-    // Only then may texts go that the list named till now.
+    // Only now can the texts be removed that the list has named until now.
     const QByteArray bytes = QJsonDocument(list).toJson();
     if (bytes != list_) {
         if (!folder_->writeList(bytes)) {

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "KeptReport.h"
 #include "RecoveryFolder.h"
 
 #include <QHash>
@@ -15,25 +16,10 @@ class UReportDoc;
 namespace kareport
 {
 
-struct ReadNotes;
-
-/// An open report as it is kept on the disk.
-struct KeptReport
-{
-    QString title;
-    QString path;                       ///< of its file; empty for a report that has none
-    QString textFile;                   ///< holds what was not saved; empty when the report's own file holds all
-    int linesPerPage = 0;               ///< of a page that was given; 0 for a measured one
-    std::vector<qint64> pageLines = {}; ///< the lines that the pages of that text begin with, from 0
-
-    /// What the user knows it by: a report that was opened from a file has no title.
-    QString name() const;
-};
-
 /// Keeps what is open on the disk, so that it comes back after a crash.
 ///
-/// Every running program has a folder of its own, which goes with a regular end. A folder whose program no longer runs was
-/// left by a crash. Other folders, and links, are nobody's business here.
+/// Every running program has a folder of its own, which is removed when the program ends regularly. A folder whose
+/// program no longer runs was left by a crash. Other folders, and links, are ignored.
 class Recovery
 {
 public:
@@ -48,21 +34,16 @@ public:
 
     /// What programs that crashed had open, the reports that were opened first coming first.
     std::vector<KeptReport> leftReports() const;
-    /// Opens one of them again, with what was not saved. @param notes  may be null
-    /// @return null when it cannot be opened, there is no memory for it, or the user has stopped it
-    static UReportDoc *reopen(const KeptReport &kept, ReadNotes *notes = nullptr);
-    /// Whether the text of one of them is still there.
-    static bool holdsText(const KeptReport &kept);
     /// Folders of programs that crashed whose lists cannot be read. They stay as they are.
     const QStringList &unreadableFolders() const { return unreadable_; }
-    /// Throws away what crashed programs left. @param lost  what could not be opened again: a folder that holds such a text
+    /// Deletes what crashed programs left. @param lost  what could not be opened again: a folder that holds such a text
     /// stays, and is offered at the next start
     void discardLeft(const std::vector<KeptReport> &lost = {});
 
     /// Writes down what is open now. Texts that have not changed since are not written again, and those that are being
     /// written by a job not yet. @return whether all of it is on the disk
     bool keep();
-    /// A report has been closed: what comes in its place in memory is another one.
+    /// A report has been closed: a new report may get its address.
     void forget(const UReportDoc *report);
 
 private:

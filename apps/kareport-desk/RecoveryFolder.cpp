@@ -26,7 +26,7 @@ bool isTextName(const QString &name)
     return number.match(name).hasMatch();
 }
 
-/// What a program that was killed while it wrote leaves beside the file that it would have replaced.
+/// What a program that was killed while it wrote leaves next to the file that it would have replaced.
 bool isHalfWritten(const QString &name)
 {
     static const QRegularExpression form(QStringLiteral("\\A(?:[0-9]+|reports\\.json)\\.[A-Za-z0-9]{6}\\z"));
@@ -125,7 +125,7 @@ QStringList RecoveryFolder::ownNames() const
     // Where the folder's name does not say that a program made it, only the list says which texts are a program's.
     const bool isNamed = !QUuid(QFileInfo(path_).fileName()).isNull();
     QStringList listed;
-    for (const QJsonValue &entry : list().value_or(QJsonArray())) {
+    for (const QJsonValue entry : list().value_or(QJsonArray())) {
         listed.append(entry[QStringLiteral("text")].toString());
     }
     for (const QString &name : QDir(path_).entryList(QDir::Files | QDir::Hidden)) {

@@ -1,9 +1,11 @@
 #include "UnitsPage.h"
 
+#include "OrientationOrder.h"
 #include "PlainWidgets.h"
 #include "TextBuffer.h"
 #include "UFormatAngle.h"
 #include "UFormatBearing.h"
+#include "UnitFactors.h"
 #include "VariableType.h"
 #include "Xlate.h"
 
@@ -18,7 +20,10 @@
 #include <QRegularExpressionValidator>
 #include <QSpinBox>
 
+#include <initializer_list>
 #include <numbers>
+#include <type_traits>
+#include <utility>
 
 namespace kareport
 {
@@ -36,13 +41,23 @@ constexpr double sampleArea = 25600.5;                                          
 constexpr double sampleAngle = (7 + 5 / 60.0) * std::numbers::pi / 180;                     // 7°05'
 constexpr double sampleBearing = (135 + 4 / 60.0 + 9.25 / 3600.0) * std::numbers::pi / 180; // 135°04'09.25"
 
-/// A list of choices in the order of the values that they mean.
-QComboBox *choice(const QStringList &items, int current)
+/// A list of choices, each with the value that it means.
+template <typename Value>
+QComboBox *choice(Value current, std::initializer_list<std::pair<std::type_identity_t<Value>, QString>> items)
 {
     auto *box = new QComboBox;
-    box->addItems(items);
-    box->setCurrentIndex(current);
+    for (const auto &[value, text] : items) {
+        box->addItem(text, static_cast<int>(value));
+    }
+    box->setCurrentIndex(box->findData(static_cast<int>(current)));
     return box;
+}
+
+/// The value that was chosen.
+template <typename Value>
+Value chosenIn(const QComboBox &box)
+{
+    return static_cast<Value>(box.currentData().toInt());
 }
 
 QSpinBox *decimals(int value, int most)
@@ -71,25 +86,35 @@ void addPair(QFormLayout &form, const QString &label, QWidget *first, const QStr
 
 UnitsPage::UnitsPage(const UJobSettings &settings, QWidget *parent)
     : QWidget(parent),
-      lengthUnit_(choice({Xlate("Metre"), Xlate("Millimetre"), Xlate("Kilometre"), Xlate("International foot"),
-                          Xlate("US survey foot")},
-                         static_cast<int>(settings.lengthUnit))),
+      lengthUnit_(choice(settings.lengthUnit, {{LengthUnit::Metre, Xlate("Metre")},
+                                               {LengthUnit::Millimetre, Xlate("Millimetre")},
+                                               {LengthUnit::Kilometre, Xlate("Kilometre")},
+                                               {LengthUnit::InternationalFoot, Xlate("International foot")},
+                                               {LengthUnit::UsSurveyFoot, Xlate("US survey foot")}})),
       lengthDecimals_(decimals(settings.lengthDecimals, mostDecimals)),
-      areaUnit_(choice(
-          {Xlate("Square metre"), Xlate("Hectare"), Xlate("Square kilometre"), Xlate("Square foot"), Xlate("Acre")},
-          static_cast<int>(settings.areaUnit))),
-      angleUnit_(choice({Xlate("Degree"), Xlate("Gon"), Xlate("Radian")}, static_cast<int>(settings.angleUnit))),
+      areaUnit_(choice(settings.areaUnit, {{AreaUnit::SquareMetre, Xlate("Square metre")},
+                                           {AreaUnit::Hectare, Xlate("Hectare")},
+                                           {AreaUnit::SquareKilometre, Xlate("Square kilometre")},
+                                           {AreaUnit::SquareFoot, Xlate("Square foot")},
+                                           {AreaUnit::Acre, Xlate("Acre")}})),
+      angleUnit_(choice(settings.angleUnit, {{AngleUnit::Degree, Xlate("Degree")},
+                                             {AngleUnit::Gon, Xlate("Gon")},
+                                             {AngleUnit::Radian, Xlate("Radian")}})),
       numberDecimals_(decimals(settings.numberDecimals, mostDecimals)),
-      stationFormat_(choice({QStringLiteral("12345.678"), QStringLiteral("123+45.678"), QStringLiteral("12+345.678")},
-                            static_cast<int>(settings.stationFormat))),
+      stationFormat_(
+          choice(settings.stationFormat, {{UJobSettings::StationFormat::Plain, QStringLiteral("12345.678")},
+                                          {UJobSettings::StationFormat::HundredsPlus, QStringLiteral("123+45.678")},
+                                          {UJobSettings::StationFormat::ThousandsPlus, QStringLiteral("12+345.678")}})),
       stationDecimals_(decimals(settings.stationDecimals, mostDecimals)),
-      northEastOrder_(choice({Xlate("Easting, northing"), Xlate("Northing, easting")}, settings.northEastOrder)),
-      bearingUnit_(choice({Xlate("Degrees, minutes, seconds"), Xlate("Decimal degrees"), Xlate("Gon")},
-                          static_cast<int>(settings.bearingUnit))),
+      northEastOrder_(choice<int>(settings.northEastOrder, {{ORDER_EASTING_NORTHING, Xlate("Easting, northing")},
+                                                            {ORDER_NORTHING_EASTING, Xlate("Northing, easting")}})),
+      bearingUnit_(choice<unsigned>(
+          settings.bearingUnit,
+          {{0U, Xlate("Degrees, minutes, seconds")}, {1U, Xlate("Decimal degrees")}, {2U, Xlate("Gon")}})),
       bearingDecimals_(decimals(settings.bearingDecimals, mostBearingDecimals)),
-      bearingStyle_(choice({Xlate("Whole circle"), Xlate("Quadrant")}, settings.bearingStyle)),
+      bearingStyle_(choice<int>(settings.bearingStyle, {{0, Xlate("Whole circle")}, {1, Xlate("Quadrant")}})),
       bearingReference_(
-          choice({Xlate("From north"), Xlate("From south")}, static_cast<int>(settings.bearingReference))),
+          choice<unsigned>(settings.bearingReference, {{0U, Xlate("From north")}, {1U, Xlate("From south")}})),
       bearingPadding_(new QCheckBox(Xlate("Leading &zeros"))),
       samples_(plainLabel())
 {
@@ -157,18 +182,18 @@ UnitsPage::UnitsPage(const UJobSettings &settings, QWidget *parent)
 UJobSettings UnitsPage::settings() const
 {
     UJobSettings settings;
-    settings.lengthUnit = static_cast<LengthUnit>(lengthUnit_->currentIndex());
+    settings.lengthUnit = chosenIn<LengthUnit>(*lengthUnit_);
     settings.lengthDecimals = lengthDecimals_->value();
-    settings.areaUnit = static_cast<AreaUnit>(areaUnit_->currentIndex());
-    settings.angleUnit = static_cast<AngleUnit>(angleUnit_->currentIndex());
+    settings.areaUnit = chosenIn<AreaUnit>(*areaUnit_);
+    settings.angleUnit = chosenIn<AngleUnit>(*angleUnit_);
     settings.numberDecimals = numberDecimals_->value();
-    settings.stationFormat = static_cast<UJobSettings::StationFormat>(stationFormat_->currentIndex());
+    settings.stationFormat = chosenIn<UJobSettings::StationFormat>(*stationFormat_);
     settings.stationDecimals = stationDecimals_->value();
-    settings.northEastOrder = static_cast<qint16>(northEastOrder_->currentIndex());
-    settings.bearingUnit = static_cast<unsigned>(bearingUnit_->currentIndex());
+    settings.northEastOrder = chosenIn<qint16>(*northEastOrder_);
+    settings.bearingUnit = chosenIn<unsigned>(*bearingUnit_);
     settings.bearingDecimals = bearingDecimals_->value();
-    settings.bearingStyle = static_cast<qint16>(bearingStyle_->currentIndex());
-    settings.bearingReference = static_cast<unsigned>(bearingReference_->currentIndex());
+    settings.bearingStyle = chosenIn<qint16>(*bearingStyle_);
+    settings.bearingReference = chosenIn<unsigned>(*bearingReference_);
     settings.bearingPadding = bearingPadding_->isChecked() ? 1 : 0;
     for (std::size_t i = 0; i < angleMarks_.size(); ++i) {
         const QString mark = angleMarks_.at(i)->text();
@@ -186,9 +211,11 @@ void UnitsPage::showSamples()
         .ConvertToDisplayString(sampleBearing, bearing);
     UFormatAngle::ConvertToDMSformatString(chosen.angleMarks[0], chosen.angleMarks[1], chosen.angleMarks[2], bearing);
     const auto number = [&chosen](double value) { return QString::number(value, 'f', chosen.numberDecimals); };
+    kareport::TextBuffer length;
+    chosen.appendUnitLength(length, sampleLength, {.fromInternal = true, .withUnit = true});
     kareport::TextBuffer station;
     chosen.appendStation(station, sampleStation, {.fromInternal = true});
-    const QStringList rows = {Xlate("Length"),  chosen.UnitLengthToString(sampleLength, true, true, -1, -1, false),
+    const QStringList rows = {Xlate("Length"),  length.view().toString(),
                               Xlate("Area"),    number(chosen.ConvertToDisplay(sampleArea, VARIABLE_AREA, 0)),
                               Xlate("Angle"),   number(chosen.ConvertToDisplay(sampleAngle, VARIABLE_ANGLE, 0)),
                               Xlate("Station"), station.view().toString(),

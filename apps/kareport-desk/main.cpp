@@ -1,5 +1,4 @@
 #include "DeskApplication.h"
-#include "DeskDialogs.h"
 #include "DeskFrame.h"
 #include "DeskPreferences.h"
 #include "Language.h"

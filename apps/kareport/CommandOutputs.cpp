@@ -43,7 +43,7 @@ ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, 
         }
         if (output.kind == OutputKind::Pdf && makesNoPage(report)) {
             // The library makes a document without a page of it, which readers refuse.
-            printError(Xlate("kareport: the report is empty, and a PDF has a page at least: \"%1\" was not written")
+            printError(Xlate("kareport: the report is empty, and a PDF has at least one page: \"%1\" was not written")
                            .arg(output.file));
             status = std::max(status, exitInput);
             continue;

@@ -99,7 +99,7 @@ void RenderBatch::noteFiles(const Job &job, const QString &path)
 void RenderBatch::sayWhatWasDone(qsizetype jobs) const
 {
     if (jobs == 0) {
-        printError(Xlate("kareport: there was no job to make"));
+        printError(Xlate("kareport: there was no job to run"));
         return;
     }
     QStringList parts = {Xlate("%1 of %2 jobs made").arg(made_).arg(jobs)};

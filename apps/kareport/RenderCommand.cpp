@@ -29,7 +29,7 @@ std::optional<QString> RenderCommand::usageError() const
     auto wrong = wrongSource();
     wrong = wrong ? wrong : wrongKindName(as);
     if (!wrong && limit && !sizeFromText(*limit)) {
-        return Xlate("--limit \"%1\": a number of bytes was expected, as in 500000, 800K, 20M or 1G").arg(*limit);
+        return Xlate("--limit \"%1\": a number of bytes was expected, such as 500000, 800K, 20M or 1G").arg(*limit);
     }
     return wrong ? wrong : wrongOutputs();
 }
@@ -52,10 +52,11 @@ std::optional<QString> RenderCommand::wrongSource() const
         return Xlate("standard input is the list of jobs: no job is read from it");
     }
     if (isShort() && slice) {
-        return Xlate("--slice takes a part of several job files: these were expected");
+        return Xlate("--slice takes a part of several job files: job files were expected");
     }
     if (slice && !JobSlice::fromText(*slice)) {
-        return Xlate("--slice \"%1\": a number, a slash and the count of slices were expected, as in 3/8").arg(*slice);
+        return Xlate("--slice \"%1\": a number, a slash and the count of slices were expected, such as 3/8")
+            .arg(*slice);
     }
     return std::nullopt;
 }
@@ -63,7 +64,7 @@ std::optional<QString> RenderCommand::wrongSource() const
 std::optional<QString> RenderCommand::wrongOutputs() const
 {
     for (const QString &file : outputs) {
-        if (const auto wrong = wrongOutput(file, as)) {
+        if (auto wrong = wrongOutput(file, as)) {
             return wrong;
         }
         if (isBatch() && file != u"-" && !file.contains(QStringLiteral("{}"))) {

@@ -69,39 +69,39 @@ void addDataOptions(CLI::App &render, DataWords &words)
     const char *group = "Data of --data";
     render
         .add_option("--delimiter", words.delimiter,
-                    "What stands between cells: a character, tab, whitespace, or auto to find it out; a comma "
+                    "Delimiter of the cells: a character, tab, whitespace, or auto to detect it; a comma "
                     "otherwise")
         ->type_name("CHAR")
         ->group(group);
     render
         .add_option("--columns", words.columns,
-                    "Names of the columns in their order, as Number,Northing,-, or columns of variables by name or "
-                    "number, as Elevation=Height,Number=1")
+                    "Names of the columns in their order, such as Number,Northing,-, or columns of variables by "
+                    "name or number, such as Elevation=Height,Number=1")
         ->type_name("LIST")
         ->allow_extra_args(false)
         ->group(group);
-    render.add_option("--order", words.order, "The columns in short form, as PNEZD; - passes one over")
+    render.add_option("--order", words.order, "The columns in short form, such as PNEZD; - skips one")
         ->type_name("LETTERS")
         ->group(group);
-    render.add_option("--units", words.units, "Units of the numbers, as length=usft,angle=dms")
+    render.add_option("--units", words.units, "Units of the numbers, such as length=usft,angle=dms")
         ->type_name("LIST")
         ->allow_extra_args(false)
         ->group(group);
     render.add_option("--decimal", words.decimal, "Decimal sign of the numbers, . or ,")
         ->type_name("CHAR")
         ->group(group);
-    render.add_option("--thousands", words.thousands, "What stands between groups of three digits")
+    render.add_option("--thousands", words.thousands, "Separator of groups of three digits")
         ->type_name("CHAR")
         ->group(group);
     render.add_option("--encoding", words.encoding, "utf-8, latin-1, windows-1252 or utf-16")
         ->type_name("NAME")
         ->group(group);
-    render.add_option("--comment", words.comment, "Pass over lines that begin with this character")
+    render.add_option("--comment", words.comment, "Skip lines that begin with this character")
         ->type_name("CHAR")
         ->group(group);
-    render.add_option("--skip", words.skip, "Pass over so many lines at the beginning")->type_name("N")->group(group);
+    render.add_option("--skip", words.skip, "Skip this many lines at the beginning")->type_name("N")->group(group);
     render.add_flag("--no-header", words.hasNoHeader, "The first row is data already")->group(group);
-    render.add_flag("--skip-blank-lines", words.skipsBlankLines, "Pass over blank lines")->group(group);
+    render.add_flag("--skip-blank-lines", words.skipsBlankLines, "Skip blank lines")->group(group);
 }
 
 /// What the options of `kareport render` are read into.
@@ -150,15 +150,15 @@ CLI::App *addRender(CLI::App &program, RenderOptions &options)
     CLI::App *render =
         program.add_subcommand("render", "Make reports from job files, or one from a template and a data file");
     render->add_option("JOB", options.jobs,
-                       "Job file (JSON), - for standard input; several are made one after the other");
+                       "Job file (JSON), - for standard input; several are run one after the other");
     render->add_option("--jobs", options.jobList, "File with the name of a job file on each line; - for standard input")
         ->type_name("FILE");
     render
         ->add_option("--slice", options.slice,
-                     "Make only every Nth job, beginning with the Kth: several processes then share a list")
+                     "Run only every Nth job, beginning with the Kth, so that several processes share a list")
         ->type_name("K/N");
     render->add_flag("--update", options.onlyOutdated,
-                     "Leave a job out whose outputs are newer than its job file, template and data");
+                     "Skip a job whose outputs are newer than its job file, template and data");
     render->add_option("-t,--template", options.templateFile, "Template file, instead of a job file")
         ->type_name("FILE");
     render->add_option("-n,--name", options.templateName, "Name of the template in the file")->type_name("NAME");
@@ -173,26 +173,26 @@ CLI::App *addRender(CLI::App &program, RenderOptions &options)
         ->type_name("FILE");
     render
         ->add_option("-o,--output", options.outputs,
-                     "Output file instead of the job's; - for standard output, {} for the job file's name. May stand "
-                     "several times")
+                     "Output file instead of the job's; - for standard output, {} for the job file's name. Can be "
+                     "given several times")
         ->type_name("FILE")
         ->allow_extra_args(false);
-    render->add_option("--as", options.as, "Kind of the outputs where their names do not say it: " + kindNames())
+    render->add_option("--as", options.as, "Kind of the outputs whose names do not show it: " + kindNames())
         ->type_name("KIND");
     render
-        ->add_option("--set", options.sets, "Set a key of the job, as settings.lengthUnit=ft. May stand several times")
+        ->add_option("--set", options.sets,
+                     "Set a key of the job, such as settings.lengthUnit=ft. Can be given several times")
         ->type_name("KEY=VALUE")
         ->allow_extra_args(false);
     render
         ->add_option("--limit", options.limit,
-                     "Write no report whose text, and no output that, becomes larger, as 20M (K, M, G, or bytes)")
+                     "Write no report whose text or output is larger than this, such as 20M (K, M, G, or bytes)")
         ->type_name("SIZE");
     render->add_flag("--strict", options.strict,
-                     "Take it for an error when a column is no variable, or when no column fills a field");
-    render->add_option("--notes", options.notes, "Write what is noted on the data to a file, as JSON")
-        ->type_name("FILE");
-    render->add_flag("--progress", options.progress, "Show how far the work has come");
-    render->add_flag("--quiet", options.quiet, "Say nothing but errors");
+                     "Treat it as an error when a column is not a variable, or when no column fills a field");
+    render->add_option("--notes", options.notes, "Write the notes on the data to a file, as JSON")->type_name("FILE");
+    render->add_flag("--progress", options.progress, "Show the progress of the work");
+    render->add_flag("--quiet", options.quiet, "Print nothing but errors");
     addDataOptions(*render, options.dataWords);
     render->footer(
         "Examples:\n"
@@ -225,23 +225,25 @@ struct ConvertOptions
 CLI::App *addConvert(CLI::App &program, ConvertOptions &options)
 {
     CLI::App *convert =
-        program.add_subcommand("convert", "Turn a saved report into another kind, by the names' endings");
+        program.add_subcommand("convert", "Convert a saved report to another kind, by the endings of the names");
     convert->add_option("IN", options.input, "Saved report: a report file, rich text, or plain text in UTF-8")
         ->required();
     convert->add_option("OUT", options.output, "Output file; - for standard output")->required();
-    convert->add_option("--as", options.as, "Kind of the output where its name does not say it: " + kindNames())
+    convert->add_option("--as", options.as, "Kind of the output if its name does not show it: " + kindNames())
         ->type_name("KIND");
     convert
-        ->add_option("--set", options.sets, "Set a key of the page, as page.linesPerPage=60. May stand several times")
+        ->add_option("--set", options.sets,
+                     "Set a key of the page, such as page.linesPerPage=60. Can be given several times")
         ->type_name("KEY=VALUE")
         ->allow_extra_args(false);
-    convert->add_flag("--progress", options.progress, "Show how far the work has come");
-    convert->add_flag("--quiet", options.quiet, "Say nothing but errors");
-    convert->footer("The pages of a PDF are those of the report: its header lines tell how many lines a page has. A\n"
-                    "report without header lines is cut into pages as measured, or as page.linesPerPage says.\n"
-                    "Examples:\n"
-                    "  kareport convert stakeout.rep stakeout.pdf\n"
-                    "  kareport convert stakeout.rep stakeout.pdf --set page.paper=Letter --set page.linesPerPage=60");
+    convert->add_flag("--progress", options.progress, "Show the progress of the work");
+    convert->add_flag("--quiet", options.quiet, "Print nothing but errors");
+    convert->footer(
+        "The pages of a PDF are those of the report: its header lines give the number of lines of a page. A\n"
+        "report without header lines is cut into pages as measured, or as page.linesPerPage says.\n"
+        "Examples:\n"
+        "  kareport convert stakeout.rep stakeout.pdf\n"
+        "  kareport convert stakeout.rep stakeout.pdf --set page.paper=Letter --set page.linesPerPage=60");
     return convert;
 }
 
@@ -251,7 +253,7 @@ int runReportCommand(const Command &command, const char *name, int argc, char **
 {
     if (const auto wrong = command.usageError()) {
         kareport::printError(QStringLiteral("kareport: ") + *wrong);
-        kareport::printError(QStringLiteral("kareport %1 --help tells more.").arg(QLatin1StringView(name)));
+        kareport::printError(QStringLiteral("See kareport %1 --help.").arg(QLatin1StringView(name)));
         return exitUsage;
     }
     return command.run(argc, argv);
@@ -282,7 +284,7 @@ int runProgram(int argc, char **argv)
     program.require_subcommand(1);
     program.footer("Exit status: 0 done, 1 wrong command line, 2 wrong input (nothing of it is written), "
                    "3 an output could not be written.\n"
-                   "kareport COMMAND --help tells more about a command.");
+                   "See kareport COMMAND --help for the options of a command.");
 
     RenderOptions render;
     CLI::App *renderCommand = addRender(program, render);
@@ -301,8 +303,8 @@ int runProgram(int argc, char **argv)
     templatesCommand->add_flag("--json", templatesJson, "Write JSON, for programs");
 
     std::string checkFile;
-    CLI::App *checkCommand =
-        program.add_subcommand("check", "Say what in a template file is not read, or not as it looks");
+    CLI::App *checkCommand = program.add_subcommand(
+        "check", "Report what in a template file is not read, or is read differently from how it looks");
     checkCommand->add_option("FILE", checkFile, "Template file")->required();
     checkCommand->footer("Each remark is one line, file:line:column: warning|error: text.\n"
                          "Exit status: 0 without errors, 2 with.");

@@ -37,7 +37,7 @@ QStringList PdfNotes::warnings() const
                      .arg(linesOf(reduced), pointsOf(reduced));
     }
     if (broken.count > 0) {
-        texts += Xlate("%1 wider than the page in type of %2 points: what is too wide goes on below")
+        texts += Xlate("%1 wider than the page in type of %2 points: what is too wide continues below")
                      .arg(linesOf(broken), pointsOf(broken));
     }
     for (std::size_t i = 0; i < std::min(missing.size(), mostWarnings); ++i) {

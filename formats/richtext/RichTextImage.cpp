@@ -3,6 +3,7 @@
 #include "MemoryLasts.h"
 
 #include <cstddef>
+#include <iterator>
 #include <utility>
 
 namespace kareport
@@ -51,7 +52,8 @@ void RichTextImage::setOn(bool on)
 {
     if (on) {
         const QString key = QStringLiteral("<<%1>>").arg(placeholder);
-        std::array<ParagraphTemplate, 4> made; // all of them or none
+        decltype(templates_) made; // all of them or none
+        static_assert(std::size(sources) == std::tuple_size_v<decltype(made)>, "each style has a source");
         for (std::size_t style = 0; style < made.size(); ++style) {
             QString paragraph = sources[style];
             cutToParagraph(paragraph);
@@ -91,7 +93,7 @@ void RichTextImage::add(QStringView text, int style, Form form)
     const ParagraphTemplate &paragraph = templates_[static_cast<std::size_t>(style)];
     pieces_ += paragraph.before;
     pieces_ += text;
-    pieces_ += paragraph.behind;
+    pieces_ += paragraph.after;
 }
 
 QString RichTextImage::document(const QString &fontName, unsigned fontSize, Form form) const

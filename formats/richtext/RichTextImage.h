@@ -47,7 +47,7 @@ private:
     struct ParagraphTemplate
     {
         QString before; ///< what comes before the text
-        QString behind;
+        QString after;
     };
 
     void add(QStringView text, int style, Form form);

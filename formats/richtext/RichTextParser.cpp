@@ -54,7 +54,7 @@ QString RichTextParser::read()
         case RichTextTokenKind::GroupStart: error = openGroup(); break;
         case RichTextTokenKind::GroupEnd: isOpen = closeGroup(); break;
         case RichTextTokenKind::MissingData:
-            error = Xlate("%1 bytes of data were expected behind \\bin").arg(token.number);
+            error = Xlate("%1 bytes of data were expected after \\bin").arg(token.number);
             break;
         case RichTextTokenKind::End:
             error = Xlate("a closing brace was expected: groups that are still open: %1").arg(openGroups());
@@ -88,7 +88,7 @@ QString RichTextParser::openGroup()
 {
     fallback_ = 0;
     if (openGroups() >= mostGroups) {
-        return Xlate("at most %1 groups inside each other were expected").arg(mostGroups);
+        return Xlate("at most %1 nested groups were expected").arg(mostGroups);
     }
     if (skipDepth_ > 0) {
         ++skipDepth_;

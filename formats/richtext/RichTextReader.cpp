@@ -39,7 +39,7 @@ std::optional<RichTextError> readBytes(QByteArrayView bytes, RichTextRawBytes ra
     if (!isRichText(bytes)) {
         target.clear();
         return RichTextError{{},
-                             Xlate("%1 was expected, with which a rich text begins").arg(QLatin1StringView(beginning))};
+                             Xlate("a rich text that begins with %1 was expected").arg(QLatin1StringView(beginning))};
     }
     RichTextParser parser(bytes, rawBytes, target);
     const QString error = parser.read();

@@ -102,7 +102,7 @@ QString linkTarget(const QString &path, QString *error)
     Walk walk;
     const auto target = path.isEmpty() ? path : walk.target(path);
     if (!target && error != nullptr) {
-        *error = Xlate("the link \"%1\" belongs to another user and stands in a folder that everybody can write to")
+        *error = Xlate("the link \"%1\" belongs to another user and is in a folder that everybody can write to")
                      .arg(walk.link);
     }
     return target.value_or(QString());

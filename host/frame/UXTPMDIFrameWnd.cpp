@@ -31,14 +31,14 @@ constexpr int updateInterval = 200; // milliseconds
 UXTPMDIFrameWnd::UXTPMDIFrameWnd(QWidget *parent) : QMainWindow(parent)
 {
     theFrame() = this;
-    // Neither animated nor dragged as rows of tabs: when a dock widget goes while another one moves into its place, or is
-    // dropped on a window of tabs, Qt 6.4 lays out what has gone.
+    // Neither animated nor dragged as rows of tabs: when a dock widget is destroyed while another one moves into its
+    // place, or is dropped on a window of tabs, Qt 6.4 lays out what no longer exists.
     setDockOptions(QMainWindow::AllowNestedDocks | QMainWindow::AllowTabbedDocks);
     setTabPosition(Qt::AllDockWidgetAreas, QTabWidget::North);
     new kareport::PlainTabTips(*this);
-    auto *timer = new QTimer(this);
-    connect(timer, &QTimer::timeout, this, &UXTPMDIFrameWnd::UpdateCommands);
-    timer->start(updateInterval);
+    auto *updateTimer = new QTimer(this);
+    connect(updateTimer, &QTimer::timeout, this, &UXTPMDIFrameWnd::UpdateCommands);
+    updateTimer->start(updateInterval);
     connect(qApp, &QApplication::focusChanged, this, &UXTPMDIFrameWnd::FollowKeyboard);
     connect(this, &QMainWindow::tabifiedDockWidgetActivated, this, [this](const QDockWidget *dock) {
         if (COneViewPane *pane = PaneOf(dock); pane != nullptr && pane->IsInFront()) {
@@ -49,7 +49,7 @@ UXTPMDIFrameWnd::UXTPMDIFrameWnd(QWidget *parent) : QMainWindow(parent)
 
 UXTPMDIFrameWnd::~UXTPMDIFrameWnd()
 {
-    // What stands in it goes after this: the keyboard that it loses is nobody's.
+    // Its content is destroyed after this: the keyboard that it loses goes to nothing.
     QObject::disconnect(qApp, nullptr, this, nullptr);
     QObject::disconnect(this, &QMainWindow::tabifiedDockWidgetActivated, this, nullptr);
     if (theFrame() == this) {

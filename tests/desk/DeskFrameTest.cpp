@@ -5,20 +5,14 @@
 #include "DeskCommandIds.h"
 #include "DeskPreferences.h"
 #include "FrameFixture.h"
-#include "ReportEdit.h"
-#include "SaveDialog.h"
 #include "SavedReports.h"
 #include "UApplication.h"
 #include "UReportList.h"
-#include "UReportView.h"
 #include "UReportWindowDlg.h"
 #include "UView.h"
 
-#include <QAction>
 #include <QDockWidget>
 #include <QDropEvent>
-#include <QMenu>
-#include <QMenuBar>
 #include <QMimeData>
 #include <QToolBar>
 
@@ -28,25 +22,6 @@ namespace
 {
 
 using namespace kareport;
-
-/// A report file of one line.
-QByteArray savedText(const char *line)
-{
-    return "\xEF\xBB\xBF" + QByteArray(line) + "\r\r\n";
-}
-
-/// All entries of the menus and their menus, with their keys.
-void collect(const QMenu &menu, QStringList &entries)
-{
-    for (const QAction *action : menu.actions()) {
-        if (action->menu() != nullptr) {
-            collect(*action->menu(), entries);
-        }
-        if (!action->isSeparator()) {
-            entries.append(action->text());
-        }
-    }
-}
 
 TEST(DeskFrame, OpensWhatItIsGiven)
 {
@@ -279,177 +254,6 @@ TEST(DeskFrame, ATemplateAndADataFileMakeAReport)
     EXPECT_TRUE(desk.messages.isEmpty());
 }
 
-TEST(DeskFrame, EveryMenuEntryHasTextAndNoTwoTheSameKey)
-{
-    Desk desk;
-    QStringList entries;
-    QStringList keys;
-    for (const QAction *action : desk.frame->menuBar()->actions()) {
-        collect(*action->menu(), entries);
-    }
-    for (const char *entry : {"&New",
-                              "&Open...",
-                              "&Close",
-                              "&Save",
-                              "Save &As...",
-                              "Update Text",
-                              "&Print...",
-                              "Print Pre&view",
-                              "Pa&ge Setup...",
-                              "Recent File",
-                              "E&xit",
-                              "&Undo",
-                              "Cu&t",
-                              "&Copy",
-                              "&Paste",
-                              "&Toolbar",
-                              "&Status Bar",
-                              "&New Window",
-                              "&Cascade",
-                              "&Tile Horizontally",
-                              "Tile Vertically",
-                              "&Arrange Icons",
-                              "&Help",
-                              "&About..."})
-    {
-        EXPECT_TRUE(entries.contains(QString::fromUtf8(entry))) << entry;
-    }
-    for (const QAction *action : desk.frame->findChildren<QAction *>()) {
-        for (const QKeySequence &key : action->shortcuts()) {
-            EXPECT_FALSE(keys.contains(key.toString())) << key.toString().toStdString();
-            keys.append(key.toString());
-        }
-    }
-    const std::pair<unsigned, const char *> given[] = {{fileNewCommand, "Ctrl+N"},  {fileOpenCommand, "Ctrl+O"},
-                                                       {fileSaveCommand, "Ctrl+S"}, {filePrintCommand, "Ctrl+P"},
-                                                       {undoCommand, "Ctrl+Z"},     {cutCommand, "Ctrl+X"},
-                                                       {copyCommand, "Ctrl+C"},     {pasteCommand, "Ctrl+V"}};
-    for (const auto &[id, key] : given) {
-        EXPECT_EQ(desk.frame->CommandAction(id)->shortcut().toString(), QString::fromUtf8(key));
-    }
-}
-
-TEST(DeskFrame, CommandsFollowWhetherAReportIsOpen)
-{
-    Desk desk;
-    desk.frame->UpdateCommands();
-    const unsigned needing[] = {fileSaveCommand,     fileSaveAsCommand, filePrintCommand,
-                                printPreviewCommand, pageSetupCommand,  copyCommand,
-                                findCommand,         windowNewCommand,  windowCascadeCommand};
-    for (const unsigned id : needing) {
-        EXPECT_FALSE(desk.frame->CommandAction(id)->isEnabled()) << id;
-    }
-    for (const unsigned id :
-         {unsigned(fileNewCommand), unsigned(fileOpenCommand), unsigned(exitCommand), unsigned(preferencesCommand)})
-    {
-        EXPECT_TRUE(desk.frame->CommandAction(id)->isEnabled()) << id;
-    }
-    ASSERT_TRUE(desk.frame->OnCommand(fileNewCommand));
-    desk.frame->UpdateCommands();
-    for (const unsigned id : needing) {
-        EXPECT_TRUE(desk.frame->CommandAction(id)->isEnabled()) << id;
-    }
-    EXPECT_FALSE(desk.frame->CommandAction(updateTextCommand)->isEnabled()) << "the report is nobody's object";
-    EXPECT_TRUE(desk.frame->CommandAction(viewToolBarCommand)->isChecked());
-    ASSERT_TRUE(desk.frame->OnCommand(viewToolBarCommand));
-    desk.frame->UpdateCommands();
-    EXPECT_FALSE(desk.frame->CommandAction(viewToolBarCommand)->isChecked());
-}
-
-TEST(DeskFrame, WindowsOfAReportAreTiledAndJoined)
-{
-    Desk desk;
-    ASSERT_TRUE(desk.frame->OnCommand(fileNewCommand));
-    ASSERT_TRUE(desk.frame->OnCommand(windowNewCommand));
-    ASSERT_TRUE(desk.frame->OnCommand(windowNewCommand));
-    const auto docks = desk.frame->findChildren<QDockWidget *>(QString(), Qt::FindDirectChildrenOnly);
-    ASSERT_EQ(docks.size(), 3);
-    EXPECT_EQ(docks[2]->windowTitle(), QStringLiteral("Report:3")) << "panes of one report are numbered";
-    docks[1]->setFloating(true);
-    ASSERT_TRUE(desk.frame->OnCommand(windowTileHorizontallyCommand));
-    QCoreApplication::processEvents();
-    EXPECT_FALSE(docks[1]->isFloating());
-    for (qsizetype i = 1; i < docks.size(); ++i) {
-        EXPECT_GT(docks[i]->y(), docks[i - 1]->y()) << "one above the other";
-        EXPECT_EQ(docks[i]->x(), docks[0]->x());
-    }
-    ASSERT_TRUE(desk.frame->OnCommand(windowTileVerticallyCommand));
-    QCoreApplication::processEvents();
-    for (qsizetype i = 1; i < docks.size(); ++i) {
-        EXPECT_GT(docks[i]->x(), docks[i - 1]->x()) << "side by side";
-    }
-    ASSERT_TRUE(desk.frame->OnCommand(windowCascadeCommand));
-    EXPECT_EQ(desk.frame->tabifiedDockWidgets(docks[0]).size(), 2);
-    desk.answer = MessageAnswer::No;
-}
-
-/// Counts how often widgets get another place or size.
-class PlacesCounted : public QObject
-{
-public:
-    bool eventFilter(QObject * /*watched*/, QEvent *event) override
-    {
-        count += event->type() == QEvent::Resize || event->type() == QEvent::Move ? 1 : 0;
-        return false;
-    }
-    int count = 0;
-};
-
-TEST(DeskFrame, TilingLaysThePanesOutOnce)
-{
-    Desk desk;
-    for (int i = 0; i < 24; ++i) {
-        ASSERT_TRUE(desk.frame->OnCommand(fileNewCommand));
-    }
-    const auto docks = desk.frame->findChildren<QDockWidget *>(QString(), Qt::FindDirectChildrenOnly);
-    for (const unsigned command : {windowTileHorizontallyCommand, windowTileVerticallyCommand, windowCascadeCommand}) {
-        for (qsizetype i = 0; i < docks.size(); i += 2) {
-            docks[i]->setFloating(true);
-        }
-        QCoreApplication::processEvents();
-        PlacesCounted places;
-        for (QDockWidget *dock : docks) {
-            dock->installEventFilter(&places);
-        }
-        ASSERT_TRUE(desk.frame->OnCommand(command));
-        // One that floats is moved once more. Were all laid out for each of them, a hundred panes would take a minute.
-        EXPECT_LE(places.count, 6 * docks.size()) << command;
-        for (const QDockWidget *dock : docks) {
-            EXPECT_FALSE(dock->isFloating()) << command;
-            EXPECT_TRUE(dock->isVisible()) << command;
-        }
-    }
-    desk.answer = MessageAnswer::No;
-}
-
-TEST(DeskFrame, AKeyGoesFromReportToReport)
-{
-    Desk desk;
-    for (int i = 0; i < 3; ++i) {
-        ASSERT_TRUE(desk.frame->OnCommand(fileNewCommand));
-    }
-    const auto reports = Desk::reports();
-    const auto press = [&desk](Qt::KeyboardModifiers modifiers) {
-        desk.frame->activateWindow();
-        EXPECT_TRUE(QTest::qWaitFor([] { return QApplication::focusWidget() != nullptr; }));
-        desk.frame->UpdateCommands();
-        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Tab, modifiers);
-        return desk.frame->GetActiveView() != nullptr ? desk.frame->GetActiveView()->GetDocument() : nullptr;
-    };
-    constexpr Qt::KeyboardModifiers forward = Qt::ControlModifier;
-    constexpr Qt::KeyboardModifiers back = Qt::ControlModifier | Qt::ShiftModifier;
-    EXPECT_EQ(press(forward), reports[0]) << "the first comes after the last";
-    EXPECT_EQ(press(forward), reports[1]);
-    EXPECT_EQ(press(back), reports[0]);
-    EXPECT_EQ(press(back), reports[2]);
-    EXPECT_TRUE(desk.frame->GetActiveView()->GetWidget()->isAncestorOf(QApplication::focusWidget()))
-        << "with the keyboard";
-    EXPECT_TRUE(reports[2]->IsEmpty()) << "and nothing is typed";
-    reports[0]->GetViews().front()->GetParentPane()->ShowPane(false); // as while an editor has it
-    EXPECT_EQ(press(forward), reports[1]) << "what nobody can see is passed over";
-    desk.answer = MessageAnswer::No;
-}
-
 TEST(DeskFrame, ClosingAsksForEveryReportThatHasChanged)
 {
     struct Row
@@ -531,131 +335,6 @@ TEST(DeskFrame, WhatIsDroppedIsOpened)
     QCoreApplication::sendEvent(&*desk.frame, &drop);
     EXPECT_EQ(Desk::reports().size(), 2U) << "files of this machine only";
     desk.answer = MessageAnswer::No;
-}
-
-TEST(DeskFrame, AFileThatChangesOnTheDiskIsOfferedAgain)
-{
-    struct Row
-    {
-        MessageAnswer answer;
-        bool isEdited;
-        const char *text;
-        const char *reason;
-    };
-    for (const Row &row : {Row{MessageAnswer::Yes, false, "TALVEN new\n", "loaded again"},
-                           Row{MessageAnswer::No, false, "TALVEN\n", "left as it was read"},
-                           Row{MessageAnswer::Yes, true, "TALVEN new\n", "also over changes, when the user says so"},
-                           Row{MessageAnswer::No, true, "xTALVEN\n", "the user's changes stay"}})
-    {
-        const JobFolder folder;
-        folder.put("a.rep", savedText("TALVEN"));
-        Desk desk;
-        ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.rep")));
-        UReportDoc *report = Desk::reports().front();
-        if (row.isEdited) {
-            QTest::keyClick(&dynamic_cast<UReportView *>(desk.frame->GetActiveView())->GetEdit(), Qt::Key_X);
-        }
-        QTest::qWait(1); // the watch begins behind the opening
-        desk.answer = row.answer;
-        folder.put("a.rep", savedText("TALVEN new"));
-        EXPECT_TRUE(QTest::qWaitFor([&desk] { return !desk.messages.isEmpty(); })) << row.reason;
-        EXPECT_EQ(desk.messages.value(0).contains(QStringLiteral("not saved")), row.isEdited) << row.reason;
-        EXPECT_EQ(Desk::textOf(*report), QString::fromUtf8(row.text)) << row.reason;
-        EXPECT_EQ(report->IsModified(), row.isEdited && row.answer == MessageAnswer::No) << row.reason;
-        desk.answer = MessageAnswer::No;
-    }
-}
-
-TEST(DeskFrame, ItsOwnSavesAreNoChangesOfOthers)
-{
-    const JobFolder folder;
-    folder.put("a.rep", savedText("TALVEN"));
-    folder.put("other.rep", savedText("TALVEN"));
-    Desk desk;
-    ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.rep")));
-    ASSERT_TRUE(desk.frame->OpenFile(folder.path("other.rep")));
-    QTest::qWait(1);
-    Desk::reports().front()->WriteLine(QStringLiteral("more"), 0, 1, 0);
-    ASSERT_TRUE(Desk::reports().front()->DoFileSave());
-    QTest::qWait(1);
-    // A change of the other file that is told shows that this one would have been told by then.
-    folder.put("other.rep", savedText("TALVEN changed"));
-    EXPECT_TRUE(QTest::qWaitFor([&desk] { return !desk.messages.isEmpty(); }));
-    EXPECT_EQ(desk.messages.size(), 1);
-    EXPECT_TRUE(desk.messages.value(0).contains(QStringLiteral("other.rep")));
-}
-
-/// The view of a report that the user sees.
-UReportView *visibleView(const UReportDoc &report)
-{
-    for (UView *view : report.GetViews()) {
-        if (view->IsVisible()) {
-            return dynamic_cast<UReportView *>(view);
-        }
-    }
-    return nullptr;
-}
-
-TEST(DeskFrame, AReportOfAJobWithARichTextImageIsEditedSavedAndLoadedAgainAsAnyOther)
-{
-    const JobFolder folder;
-    folder.put("a.json", R"({"title": "Lines", "header": false, "page": {"linesPerPage": 60, "charsPerRow": 80},
-                             "report": [{"line": "First line"}],
-                             "output": [{"file": "word.rtf", "as": "rtf-image"}]})");
-    Desk desk;
-    desk.answer = MessageAnswer::No;
-    ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.json")));
-    UReportDoc *report = Desk::reports().front();
-    EXPECT_FALSE(report->GetRTFDataFlag()) << "the view shows the text";
-    dynamic_cast<UReportWindowDlg *>(report->GetReportWindow())->ShowReport();
-    QCoreApplication::processEvents();
-    ASSERT_NE(visibleView(*report), nullptr);
-    QTest::keyClick(&visibleView(*report)->GetEdit(), Qt::Key_X);
-    setSaveDialog([&folder](const SaveRequest &) { return folder.path("x.rtf"); });
-    EXPECT_TRUE(report->DoSave(QString(), true));
-    setSaveDialog({});
-    EXPECT_NE(contentOf(folder.path("x.rtf")).find("xFirst line"), std::string::npos) << "what was typed is saved";
-    EXPECT_EQ(Desk::textOf(*report), QStringLiteral("xFirst line\n")) << "and stays";
-    for (const bool isOn : {false, true}) {
-        report->SetRTFDataFlag(isOn);
-        folder.put("x.rtf", "{\\rtf1 new}");
-        ASSERT_TRUE(reloadSavedReport(*report));
-        EXPECT_EQ(Desk::textOf(*report), QStringLiteral("{\\rtf1 new}\n")) << "whatever the mode was: " << isOn;
-    }
-}
-
-TEST(DeskFrame, WhatIsTypedAfterAReportWasGivenUpIsNotThrownAway)
-{
-    struct Row
-    {
-        bool isTyped;
-        const char *reason;
-    };
-    for (const Row &row :
-         {Row{false, "not to be saved, and nobody can see it"}, Row{true, "the answer was about what there was then"}})
-    {
-        Desk desk;
-        desk.answer = MessageAnswer::No;
-        const JobFolder folder;
-        folder.put("a.json", lineJob());
-        ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.json")));
-        UReportDoc *report = Desk::reports().front();
-        ASSERT_TRUE(desk.frame->OnCommand(windowNewCommand));
-        dynamic_cast<UReportWindowDlg *>(report->GetReportWindow())->OnPressCloseButton();
-        QCoreApplication::processEvents();
-        ASSERT_TRUE(UReportDoc::IsReportAvailable(report)) << "its second pane shows it";
-        UReportView *view = visibleView(*report);
-        ASSERT_NE(view, nullptr);
-        if (row.isTyped) {
-            QTest::keyClick(&view->GetEdit(), Qt::Key_X);
-        }
-        for (UView *each : report->GetViews()) {
-            each->GetParentPane()->ShowPane(false);
-        }
-        EXPECT_TRUE(QTest::qWaitFor([report] { return !UReportDoc::IsReportAvailable(report) || report->IsShown(); }))
-            << row.reason;
-        EXPECT_EQ(UReportDoc::IsReportAvailable(report), row.isTyped) << row.reason;
-    }
 }
 
 } // namespace

@@ -346,7 +346,7 @@ TEST(DeskLongReport, ComesBackAfterACrashWhileTheWindowsAnswer)
     const kareport::KeptReport kept = {QStringLiteral("R"), QString(), folder.path("1"), 0, {0, 7, 1000}};
     bool hasAnswered = false;
     meanwhile([&] { hasAnswered = Desk::reports().empty(); });
-    const UReportDoc *report = kareport::Recovery::reopen(kept);
+    const UReportDoc *report = kareport::reopenReport(kept);
     ASSERT_NE(report, nullptr);
     EXPECT_TRUE(hasAnswered);
     EXPECT_TRUE(report->CopyText() == text);

@@ -58,16 +58,16 @@ TEST(Recovery, WhatWasOpenComesBackAfterACrash)
     EXPECT_TRUE(left[1].textFile.isEmpty()) << "its own file holds all of it";
     EXPECT_EQ(left[2].path, files.path("edited.rep"));
 
-    const UReportDoc *unsaved = Recovery::reopen(left[0]);
+    const UReportDoc *unsaved = kareport::reopenReport(left[0]);
     ASSERT_NE(unsaved, nullptr);
     EXPECT_EQ(unsaved->CopyText(), text) << "to the character";
     EXPECT_EQ(unsaved->GetTitle(), QStringLiteral("Traverse"));
     EXPECT_TRUE(unsaved->IsModified()) << "closing it asks";
     EXPECT_TRUE(unsaved->GetPathName().isEmpty());
-    const UReportDoc *saved = Recovery::reopen(left[1]);
+    const UReportDoc *saved = kareport::reopenReport(left[1]);
     ASSERT_NE(saved, nullptr);
     EXPECT_FALSE(saved->IsModified());
-    const UReportDoc *edited = Recovery::reopen(left[2]);
+    const UReportDoc *edited = kareport::reopenReport(left[2]);
     ASSERT_NE(edited, nullptr);
     EXPECT_TRUE(edited->CopyText().endsWith(QStringLiteral("new\r\n")));
     EXPECT_EQ(edited->GetPathName(), files.path("edited.rep")) << "saving it goes to its file";
@@ -102,7 +102,7 @@ TEST(Recovery, PagesComeBack)
     desk.answer = MessageAnswer::No;
     Recovery recovery(folder.path());
     ASSERT_EQ(recovery.leftReports().size(), 1U);
-    const UReportDoc *report = Recovery::reopen(recovery.leftReports()[0]);
+    const UReportDoc *report = kareport::reopenReport(recovery.leftReports()[0]);
     ASSERT_NE(report, nullptr);
     EXPECT_EQ(report->GetPageStarts(), starts);
     EXPECT_EQ(report->GetLinesPerPage(), 7);
@@ -129,7 +129,7 @@ TEST(Recovery, FormatsOfAnEditedRichTextComeBack)
     desk.answer = MessageAnswer::No;
     Recovery recovery(folder.path());
     ASSERT_EQ(recovery.leftReports().size(), 1U);
-    const UReportDoc *report = Recovery::reopen(recovery.leftReports().front());
+    const UReportDoc *report = kareport::reopenReport(recovery.leftReports().front());
     ASSERT_NE(report, nullptr);
     const kareport::ReportEdit &edit = dynamic_cast<UReportView *>(report->GetViews().front())->GetEdit();
     EXPECT_EQ(edit.toPlainText().trimmed(), QStringLiteral("xbold"));
@@ -246,12 +246,12 @@ TEST(Recovery, SpoiledFilesAreNoReports)
         Recovery recovery(folder.path());
         EXPECT_EQ(recovery.leftReports().size(), row.count) << row.reason;
         for (const KeptReport &kept : recovery.leftReports()) {
-            EXPECT_EQ(Recovery::reopen(kept), nullptr) << row.reason;
+            EXPECT_EQ(kareport::reopenReport(kept), nullptr) << row.reason;
         }
     }
 }
 
-/// Files of somebody else's, which nothing may happen to.
+/// Files of others, which nothing may happen to.
 class ForeignFiles
 {
 public:
@@ -305,8 +305,8 @@ TEST(Recovery, LinksAreNotFollowedAndForeignFoldersAreNobodysBusiness)
         Recovery recovery(folder.path());
         const std::vector<KeptReport> left = recovery.leftReports();
         ASSERT_EQ(left.size(), 2U);
-        EXPECT_EQ(Recovery::reopen(left[0]), nullptr) << "its text is a link to somebody else's file";
-        EXPECT_NE(Recovery::reopen(left[1]), nullptr);
+        EXPECT_EQ(kareport::reopenReport(left[0]), nullptr) << "its text is a link to somebody else's file";
+        EXPECT_NE(kareport::reopenReport(left[1]), nullptr);
         EXPECT_EQ(recovery.unreadableFolders(), QStringList{linked});
         foreign.expectWhole("read");
         recovery.keep();

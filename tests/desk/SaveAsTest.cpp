@@ -1,6 +1,6 @@
 #include "SaveAs.h"
 
-#include "DeskDialogs.h"
+#include "DeskApplication.h"
 #include "DeskFixture.h"
 #include "FileSizeLimit.h"
 #include "JobFolder.h"

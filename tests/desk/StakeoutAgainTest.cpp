@@ -103,7 +103,7 @@ TEST(StakeoutAgain, ARecoveredListHasItsPagesOnSheetsAndInThePdf)
         desk.answer = MessageAnswer::No;
         kareport::Recovery recovery(folder.path());
         ASSERT_EQ(recovery.leftReports().size(), 1U);
-        expectPagesOfTheJob(kareport::Recovery::reopen(recovery.leftReports().front()));
+        expectPagesOfTheJob(kareport::reopenReport(recovery.leftReports().front()));
         recovery.discardLeft();
     }
 }

@@ -43,7 +43,7 @@ TEST(RecoveryAllocations, AReportIsOpenedAgainWholeOrNotAtAll)
         bool hasFailed = false;
         {
             const FailingAllocation failing(number, ofThatSize);
-            EXPECT_NO_THROW(report = Recovery::reopen(kept)) << number;
+            EXPECT_NO_THROW(report = kareport::reopenReport(kept)) << number;
             hasFailed = failing.hasFailed();
         }
         EXPECT_EQ(documents.size(), before + (report != nullptr ? 1 : 0)) << number << ": an empty report is none";

@@ -101,7 +101,7 @@ TEST(PdfExportSheets, TheWidestLineDecidesTheTypeSize)
         {174, 5, 2,
          QStringLiteral(
              "line 61 is wider than the page: the type is 5 points on all pages|line 61 is wider than the page in "
-             "type of 5 points: what is too wide goes on below"),
+             "type of 5 points: what is too wide continues below"),
          "not below 5 points"},
     };
     for (const Row &row : rows) {

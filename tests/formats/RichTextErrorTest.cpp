@@ -20,7 +20,7 @@ struct ErrorRow
 
 TEST(RichTextError, SaysWhatWasExpectedAndKeepsWhatWasRead)
 {
-    const char *beginning = "{\\rtf was expected, with which a rich text begins";
+    const char *beginning = "a rich text that begins with {\\rtf was expected";
     const char *one = "a closing brace was expected: groups that are still open: 1";
     const char *two = "a closing brace was expected: groups that are still open: 2";
     const ErrorRow rows[] = {
@@ -36,11 +36,11 @@ TEST(RichTextError, SaysWhatWasExpectedAndKeepsWhatWasRead)
         {"{\\rtf1 a\\'b", 1, 12, one, u"ab", "cut off in a byte: no byte"},
         {"{\\rtf1 a{\\pict 00{ff", 1, 21, "a closing brace was expected: groups that are still open: 3", u"a",
          "cut off in a picture"},
-        {"{\\rtf1 a\n\\bin5 123}", 2, 1, "5 bytes of data were expected behind \\bin", u"a",
+        {"{\\rtf1 a\n\\bin5 123}", 2, 1, "5 bytes of data were expected after \\bin", u"a",
          "one byte of data is missing"},
-        {"{\\rtf1 a\\bin99999999999 }", 1, 9, "2147483647 bytes of data were expected behind \\bin", u"a",
+        {"{\\rtf1 a\\bin99999999999 }", 1, 9, "2147483647 bytes of data were expected after \\bin", u"a",
          "far too many"},
-        {"{\\rtf1 a{\\*\\x \\bin9 }}", 1, 15, "9 bytes of data were expected behind \\bin", u"a",
+        {"{\\rtf1 a{\\*\\x \\bin9 }}", 1, 15, "9 bytes of data were expected after \\bin", u"a",
          "in what is passed over"},
         {"{\\rtf1 \xB0\xB0{", 1, 11, two, u"°°", "columns of a file are bytes"},
     };
@@ -74,7 +74,7 @@ TEST(RichTextError, GroupsAreReadToALimitedDepth)
         EXPECT_FALSE(readRichText(QByteArrayView(deep(9999)), document)) << group;
         const auto error = readRichText(QByteArrayView(deep(1000000)), document);
         ASSERT_TRUE(error) << group;
-        EXPECT_EQ(error->text, QStringLiteral("at most 10000 groups inside each other were expected")) << group;
+        EXPECT_EQ(error->text, QStringLiteral("at most 10000 nested groups were expected")) << group;
         EXPECT_EQ(error->place.column, 9 + 9999 * open.size()) << group;
         EXPECT_EQ(document.toPlainText(), QStringLiteral("a"));
     }

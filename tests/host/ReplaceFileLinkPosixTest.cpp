@@ -114,11 +114,10 @@ TEST(ReplaceFileLink, AStrangersLinkKeepsItsTarget)
         EXPECT_FALSE(replaceFile(
             path, [](QIODevice &device) { return device.write("new") == 3; }, &error))
             << link;
-        EXPECT_EQ(error,
-                  QStringLiteral("the link \"%1\" belongs to another user and stands in a folder that everybody can "
-                                 "write to")
-                      .arg(QFileInfo(folder.path("shared")).canonicalFilePath() + u'/' +
-                           QString::fromUtf8(link).section(u'/', 1)));
+        EXPECT_EQ(error, QStringLiteral("the link \"%1\" belongs to another user and is in a folder that everybody can "
+                                        "write to")
+                             .arg(QFileInfo(folder.path("shared")).canonicalFilePath() + u'/' +
+                                  QString::fromUtf8(link).section(u'/', 1)));
         EXPECT_EQ(folder.bytesOf("own/file.txt"), "precious") << link;
     }
     EXPECT_EQ(QDir(folder.path("own")).entryList(QDir::Files | QDir::Hidden), QStringList{QStringLiteral("file.txt")});

@@ -60,8 +60,8 @@ TEST(CommandLineBatch, EveryJobIsMade)
         {"render b.json --jobs list", "a.txt=A b.txt=B c.txt=C", "kareport: 3 of 3 jobs made\n", "both"},
         {"render a.json b.json c.json --slice 2/2", "b.txt=B", "kareport: 1 of 1 jobs made\n", "a slice"},
         {"render --jobs list --slice 1/2", "a.txt=A", "kareport: 1 of 1 jobs made\n", "a slice of the list"},
-        {"render a.json --slice 2/2", "", "kareport: there was no job to make\n", "a slice without a job"},
-        {"render --jobs empty", "", "kareport: there was no job to make\n", "a list without a job"},
+        {"render a.json --slice 2/2", "", "kareport: there was no job to run\n", "a slice without a job"},
+        {"render --jobs empty", "", "kareport: there was no job to run\n", "a list without a job"},
         {"render a.json b.json --set report.0.line=x", "a.txt=x b.txt=x", "kareport: 2 of 2 jobs made\n",
          "a key that is set counts for all"},
     };

@@ -71,8 +71,8 @@ TEST(CommandLineClash, NothingIsWrittenWhereAnOutputWouldTakeTheWrongPlace)
         {"render --jobs list --as text --set output=[\"list\"]", "\" is the file \"list\" of this batch: ", "its list"},
         {"render --jobs list --slice 1/2 --as text --set output=[\"two.json\"]",
          "of this batch: ", "a job that another process makes"},
-        {"convert saved.rep saved.rep", "the output \"saved.rep\" is the report that is read: ", "a conversion"},
-        {"convert saved.rep here/saved.rep", "is the report that is read: ", "in other words"},
+        {"convert saved.rep saved.rep", "the output \"saved.rep\" is the report being read: ", "a conversion"},
+        {"convert saved.rep here/saved.rep", "is the report being read: ", "in other words"},
     };
     for (const Row &row : rows) {
         const LinkedFolder folder;
@@ -97,7 +97,7 @@ TEST(CommandLineClash, WhatOnlyLooksAlikeIsWritten)
 {
     constexpr const char *lines[] = {
         "render job.json -o a.txt -o A.txt", // two files where letters count
-        "render job.json -o - -o -",         // both stand in standard output
+        "render job.json -o - -o -",         // both are in standard output
         "render job.json --as text -o /dev/null -o /dev/null",
         "render job.json -o sub/points.txt -o points.txt",
         "render job.json two.json -o {}.txt",

@@ -70,7 +70,7 @@ TEST(CommandLineKinds, AnEmptyReportMakesNoPdf)
     const CommandLineFolder folder;
     folder.put("e.json", R"({"report": [], "output": ["e.pdf", "e.txt"]})");
     folder.put("e.pdf", "kept");
-    const std::string said = "kareport: the report is empty, and a PDF has a page at least: \"" +
+    const std::string said = "kareport: the report is empty, and a PDF has at least one page: \"" +
                              folder.path("e.pdf").toStdString() + "\" was not written\n";
     const ProgramRun run = folder.run("render e.json");
     EXPECT_EQ(run.status, 2);

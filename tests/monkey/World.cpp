@@ -2,7 +2,7 @@
 
 #include "Actions.h"
 #include "COneViewPane.h"
-#include "DeskDialogs.h"
+#include "DeskApplication.h"
 #include "DeskFrame.h"
 #include "JobLauncher.h"
 #include "ReportEdit.h"

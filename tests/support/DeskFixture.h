@@ -36,5 +36,11 @@ public:
     std::optional<DeskFrame> frame;
 };
 
+/// The bytes of a report file of one line.
+inline QByteArray savedText(const char *line)
+{
+    return "\xEF\xBB\xBF" + QByteArray(line) + "\r\r\n";
+}
+
 /// A job of one line, with another text where it is given.
 QByteArray lineJob(const char *line = "First line");

@@ -98,7 +98,7 @@ QString ModelledReport::data(int seed)
     return seed % 3 == 0 ? text + QStringLiteral("end") : text;
 }
 
-void ModelledReport::actAsHost(const ReportStep &step)
+bool ModelledReport::writeAsHost(const ReportStep &step)
 {
     switch (step.op) {
     case ReportOp::WriteLine: {
@@ -146,6 +146,14 @@ void ModelledReport::actAsHost(const ReportStep &step)
         isModified_ = isModified_ || model_.size() > before;
         break;
     }
+    default: return false;
+    }
+    return true;
+}
+
+void ModelledReport::actAsHost(const ReportStep &step)
+{
+    switch (step.op) {
     case ReportOp::Heading: {
         const QString heading = line(step.c % 7);
         report().SetHeading(heading, step.a % 3, step.b % 3);
@@ -195,7 +203,10 @@ void ModelledReport::actAsHost(const ReportStep &step)
         }
         return;
     case ReportOp::Reload: reload(); break;
-    default: return;
+    default:
+        if (!writeAsHost(step)) {
+            return;
+        }
     }
     tellViews();
 }

@@ -9,7 +9,7 @@
 
 #include <QTemporaryDir>
 
-/// A report with its views, beside its model.
+/// A report with its views, together with its model.
 class ModelledReport
 {
 public:
@@ -27,7 +27,7 @@ public:
 private:
     UReportDoc &report() { return shown_.report; }
 
-    /// A view of it. What it shows is another text than the report's while it was not told of a change.
+    /// A view of it. What it shows is another text than the report's while it was not notified of a change.
     struct Shown
     {
         UReportView *view;
@@ -49,7 +49,7 @@ private:
 
     void actAsHost(const ReportStep &step);
 
-    /// What has nothing to do with a text: panes, and what goes on by itself.
+    /// What has nothing to do with a text: panes, and what happens by itself.
     void actOnPanes(const ReportStep &step);
 
     /// A host that does not tell the views.
@@ -72,6 +72,8 @@ private:
 
     bool isAllCrLf() const;
 
+    /// Writes lines and data. @return false for any other step
+    bool writeAsHost(const ReportStep &step);
     /// Rich-text mode on, something written and typed, and off again: what was typed is then the report's text.
     void actInRichText(const ReportStep &step);
     void switchOn();

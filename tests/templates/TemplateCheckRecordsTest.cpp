@@ -50,7 +50,7 @@ TEST(TemplateCheckRecords, RemarksOnVariables)
          "no identifier"},
         {end,
          "<Variable><ID>9</ID>¦<VariableName>NUMBER</VariableName><Type>TEXT</Type></Variable></VariableList>",
-         {{"warning", "the variable \"NUMBER\" stands twice in the dictionary: the last one counts"}},
+         {{"warning", "the variable \"NUMBER\" is in the dictionary twice: the last one counts"}},
          "a variable twice, in any case"},
         {end,
          "¦<Variable><ID>2</ID><VariableName>R</VariableName><Type>TEXT</Type></Variable></VariableList>",

@@ -58,24 +58,24 @@ TEST(TemplateCheck, RemarksOnTags)
     const Row rows[] = {
         {title,
          "¦<Title lang=\"en\">Stakeout</Title>",
-         {{"error", "<Title lang=\"en\"> is no tag: a tag has no blanks and no attributes"}},
+         {{"error", "<Title lang=\"en\"> is not a tag: a tag has no blanks and no attributes"}},
          "an attribute"},
         {title,
          "¦<Title >Stakeout</Title>",
-         {{"error", "<Title > is no tag: a tag has no blanks and no attributes"}},
+         {{"error", "<Title > is not a tag: a tag has no blanks and no attributes"}},
          "a blank"},
         {title,
          "¦<Title>Stakeout¦</Title >",
          {{"error", "<Title> is not read: its closing tag was expected"},
-          {"error", "</Title > is no tag: a tag has no blanks and no attributes"}},
+          {"error", "</Title > is not a tag: a tag has no blanks and no attributes"}},
          "a blank in the closing tag"},
         {title,
          "</Title>¦<Title>Stakeout</Title>",
-         {{"error", "<Title> is not read: a closing tag of that name stands before it"}},
+         {{"error", "<Title> is not read: a closing tag of that name comes before it"}},
          "closed before it is opened"},
         {title,
          "<Title>Stake¦<Title>out</Title>",
-         {{"error", "<Title> stands in another <Title>: the outer one is cut short at the first closing tag"}},
+         {{"error", "<Title> is inside another <Title>: the outer one ends at the first closing tag"}},
          "an element cut short by the first closing tag"},
         {"<Label>Point</Label><Format>8</Format>",
          "<Label>Point</Label><Format>8</>¦123456",
@@ -88,7 +88,7 @@ TEST(TemplateCheck, RemarksOnTags)
          "an empty element ends its list"},
         {"<!-- what a surveyor needs -->",
          "<!-- ¦<Separator> -->",
-         {{"warning", "<Separator> is read although it stands in a comment"}},
+         {{"warning", "<Separator> is read although it is in a comment"}},
          "a tag in a comment"},
     };
     for (const Row &row : rows) {
@@ -108,12 +108,12 @@ TEST(TemplateCheck, RemarksOnTemplatesAndTheirNames)
         {QStringLiteral("¦"), {{"error", none}}, "an empty file"},
         {QStringLiteral("¦just a text\nof two lines\n"), {{"error", none}}, "no template in it"},
         {QStringLiteral("\n  ¦<ReportTemplate><Options><Separator>|</Separator></Options></ReportTemplate>"),
-         {{"error", "the template has no <Name>, so nobody can choose it"}},
+         {{"error", "the template has no <Name>, so it cannot be chosen"}},
          "a template without any name"},
         {QStringLiteral("<ReportTemplate><Name>A</Name><Separator>|</Separator>\n<Options><Separator>|</Separator>"
                         "</Options></ReportTemplate>\n<ReportTemplate>\n ¦<Name>a</Name><Options><Separator>|"
                         "</Separator></Options></ReportTemplate>"),
-         {{"warning", "a template named \"a\" stands before: the last one of a name is read"}},
+         {{"warning", "a template named \"a\" comes before this one: the last one of a name is read"}},
          "two templates of one name, in any case"},
         {QStringLiteral("<ReportTemplate><Name>A</Name><Options><Separator>|</Separator></Options></ReportTemplate>\n"
                         "¦<ReportTemplate></ReportTemplate>\n<ReportTemplate><Name>B</Name></ReportTemplate>"),
@@ -121,27 +121,27 @@ TEST(TemplateCheck, RemarksOnTemplatesAndTheirNames)
          "an empty template"},
         {changedTemplate("    <Name>STAKEOUT</Name>\n", "")
              .replace(QStringLiteral("<Name>Points"), QStringLiteral("¦<Name>Points")),
-         {{"error", "the template's own <Name> must stand before <Tables>: this one was taken for it"}},
+         {{"error", "the template's own <Name> must come before <Tables>: this one was taken for it"}},
          "no name but that of a table"},
         {changedTemplate("    <Name>STAKEOUT</Name>\n", "")
              .replace(QStringLiteral("<Name>Points"), QStringLiteral("¦<Name>Points"))
              .replace(QStringLiteral("    <Options>"), QStringLiteral("    <Name>STAKEOUT</Name>\n    <Options>")),
-         {{"error", "the template's own <Name> must stand before <Tables>: this one was taken for it"}},
+         {{"error", "the template's own <Name> must come before <Tables>: this one was taken for it"}},
          "the name stands after the tables"},
         {changedTemplate("<Name>STAKEOUT</Name>", "<Name>STAKEOUT</>")
              .replace(QStringLiteral("<Name>Points"), QStringLiteral("¦<Name>Points")),
-         {{"error", "<Name> stands in another <Name>: the outer one is cut short at the first closing tag"}},
+         {{"error", "<Name> is inside another <Name>: the outer one ends at the first closing tag"}},
          "a short closing tag where a full one of the name stands behind: the name runs on"},
         {changedTemplate("<Separator>|</Separator>", "")
              .replace(QStringLiteral("<Options>"), QStringLiteral("¦<Options>")),
-         {{"warning", "no <Separator>: the character 0 stands between the columns"}},
+         {{"warning", "no <Separator>: the columns are separated by the character 0"}},
          "no separator"},
         {changedTemplate("<Separator>|", "<Separator>")
              .replace(QStringLiteral("<Options>"), QStringLiteral("¦<Options>")),
-         {{"warning", "no <Separator>: the character 0 stands between the columns"}},
+         {{"warning", "no <Separator>: the columns are separated by the character 0"}},
          "an empty separator"},
         {QStringLiteral(" ¦<ReportTemplate><Name>A</Name></ReportTemplate>"),
-         {{"warning", "no <Separator>: the character 0 stands between the columns"}},
+         {{"warning", "no <Separator>: the columns are separated by the character 0"}},
          "no options"},
     };
     for (const auto &row : rows) {
@@ -152,7 +152,7 @@ TEST(TemplateCheck, RemarksOnTemplatesAndTheirNames)
 TEST(TemplateCheck, RemarksOnEntitiesInPrintedTexts)
 {
     for (const char *entity : {"&amp;", "&lt;", "&gt;", "&quot;", "&apos;", "&#", "<![CDATA["}) {
-        const std::string remark = std::string(entity) + " is printed as it stands";
+        const std::string remark = std::string(entity) + " is printed unchanged";
         const ExpectedRemarks expected{{"warning", remark.c_str()}};
         const QByteArray marked = QByteArray("¦") + entity;
         expectRemarks(changedTemplate("<Title>Stakeout", "<Title>Stake " + marked), expected, entity);
@@ -165,7 +165,7 @@ TEST(TemplateCheck, RemarksOnEntitiesInPrintedTexts)
 
 TEST(TemplateCheck, CountsLinesAndColumnsAsAnEditorDoes)
 {
-    const ExpectedRemarks expected{{"warning", "&amp; is printed as it stands"}};
+    const ExpectedRemarks expected{{"warning", "&amp; is printed unchanged"}};
     const struct
     {
         const char *title;
@@ -202,7 +202,7 @@ TEST(TemplateCheck, ShowsTheRemarksInTheOrderOfTheFile)
     text.replace(QStringLiteral("<VariableName>northing"), QStringLiteral("¦<VariableName>northing"));
     text.replace(QStringLiteral("<Field><VariableName>Northing"), QStringLiteral("<Field>¦<VariableName>Northing"));
     expectRemarks(text,
-                  {{"error", "<Title > is no tag: a tag has no blanks and no attributes"},
+                  {{"error", "<Title > is not a tag: a tag has no blanks and no attributes"},
                    {"error", "the dictionary has no variable \"Northing\": the column cannot be filled"},
                    {"error", "unknown type \"Kilogram\": the variable \"Northing\" is left out"},
                    {"error", "the dictionary has no variable \"northing\": the line repeats the value before it"}},

@@ -16,7 +16,7 @@ namespace
 
 constexpr unsigned scClose = 61536;
 
-/// A frame with an application whose reports stand in panes of their own, and what is said to its user.
+/// A frame with an application whose reports are in panes of their own, and what is said to its user.
 class ReportPanes
 {
 public:
@@ -187,7 +187,7 @@ TEST(CReportViewPane, WithoutAViewOfAReportItAlwaysCloses)
 {
     ReportPanes desk;
     FrameLog log;
-    UReportDoc held; // goes after its pane
+    UReportDoc held; // destroyed after its pane
     held.SetAutoDelete(false);
     held.EnableCloseOption(false);
 
@@ -393,7 +393,7 @@ TEST(CReportViewPane, TheReportMayBeClosedWhileItsNameIsAskedFor)
     }
 }
 
-TEST(CReportViewPane, TheMenusCloseLikewise)
+TEST(CReportViewPane, TheMenusCloseInTheSameWay)
 {
     for (const MessageAnswer answer : {MessageAnswer::Yes, MessageAnswer::No, MessageAnswer::Cancel}) {
         ReportPanes desk;

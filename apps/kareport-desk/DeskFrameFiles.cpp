@@ -1,0 +1,222 @@
+#include "DeskFrame.h"
+
+#include "AppMessageBox.h"
+#include "JobLauncher.h"
+#include "SavedReports.h"
+#include "SavedText.h"
+#include "UApplication.h"
+#include "UReportDoc.h"
+#include "UView.h"
+#include "Xlate.h"
+
+#include <QDir>
+#include <QFileInfo>
+#include <QStatusBar>
+
+namespace
+{
+
+/// The message about a file that exists and could not be read.
+QString whyNotRead(const QString &path, const kareport::ReadNotes &notes)
+{
+    return notes.problem.isEmpty() ? Xlate("\"%1\" could not be opened.").arg(path)
+                                   : Xlate("\"%1\" could not be opened: %2").arg(path, notes.problem);
+}
+
+/// The open document of a file; null when there is none. @param except  a document to ignore
+UDocument *documentOf(const QString &path, const UDocument *except = nullptr)
+{
+    for (UDocument *document : UApplication::Get()->GetDocuments()) {
+        if (document != except && document->GetPathName() == path) {
+            return document;
+        }
+    }
+    return nullptr;
+}
+
+/// Says how many notes there are on a report that was made, and the first of them.
+void sayNotes(const kareport::JobNotes &notes)
+{
+    constexpr qsizetype mostShown = 20;
+    QStringList lines;
+    const std::vector<kareport::JobNote> said = notes.said();
+    for (const kareport::JobNote &note : said) {
+        if (lines.size() == mostShown) {
+            lines.append(QStringLiteral("…"));
+            break;
+        }
+        lines.append(note.message());
+    }
+    if (!lines.isEmpty()) {
+        kareport::showMessage({Xlate("The report was made. Notes on its data: %1\n\n%2")
+                                   .arg(QString::number(said.size()), lines.join(u'\n')),
+                               QString(), MessageButtons::Ok, kareport::MessageIcon::Information});
+    }
+}
+
+} // namespace
+
+void DeskFrame::sayWhatIsNotShown(const QString &path, const kareport::ReadNotes &notes)
+{
+    if (!notes.warnings.isEmpty()) {
+        kareport::showMessage(
+            {Xlate("\"%1\" was opened, but not all of it is shown:\n\n%2").arg(path, notes.warnings.join(u'\n')),
+             QString(), MessageButtons::Ok, kareport::MessageIcon::Information});
+    }
+}
+
+bool DeskFrame::finishOpening(UDocument *report, const QString &error)
+{
+    if (!error.isEmpty()) {
+        AppMessageBox(error);
+    }
+    if (report != nullptr) {
+        activate(report);
+        statusBar()->clearMessage();
+    }
+    return report != nullptr;
+}
+
+bool DeskFrame::OpenTemplateJob(const kareport::TemplateJob &job)
+{
+    QString error;
+    kareport::JobNotes notes;
+    UDocument *report = kareport::launchTemplateJob(job, this, error, notes);
+    const bool isMade = finishOpening(report, error);
+    if (isMade) {
+        sayNotes(notes);
+    }
+    return isMade;
+}
+
+bool DeskFrame::OpenFile(const QString &path)
+{
+    if (const QString reason = kareport::whyNotOpened(path); !reason.isEmpty()) {
+        kareport::showMessage(
+            {reason, QFileInfo(path).fileName(), MessageButtons::Ok, kareport::MessageIcon::Information});
+        return false;
+    }
+    if (path.endsWith(u".xml", Qt::CaseInsensitive)) {
+        fromTemplate(path);
+        return true;
+    }
+    if (path.endsWith(u".json", Qt::CaseInsensitive)) {
+        return openJob(path);
+    }
+    const QString file = QDir::cleanPath(QFileInfo(path).absoluteFilePath());
+    if (reading_.contains(file)) {
+        return true;
+    }
+    kareport::ReadNotes notes;
+    UDocument *report = openReport(file, notes);
+    const QString error = report == nullptr && !notes.isStopped ? whyNotRead(path, notes) : QString();
+    const bool isOpened = finishOpening(report, error);
+    sayWhatIsNotShown(path, notes);
+    return isOpened;
+}
+
+bool DeskFrame::openJob(const QString &path)
+{
+    QString error;
+    kareport::JobNotes notes;
+    UDocument *report = kareport::launchJob(path, this, error, notes);
+    const bool isMade = finishOpening(report, error);
+    if (isMade) {
+        UApplication::Get()->AddToRecentFileList(path);
+        sayNotes(notes);
+    }
+    return isMade;
+}
+
+UDocument *DeskFrame::openReport(const QString &file, kareport::ReadNotes &notes)
+{
+    if (UDocument *open = documentOf(file)) {
+        return open;
+    }
+    UReportDoc *report = read(file, [&] { return kareport::openSavedReport(file, &notes); });
+    UDocument *other = documentOf(file, report);
+    if (report != nullptr && other != nullptr) {
+        // Another report was saved into the file while it was read: they would overwrite each other.
+        report->OnCloseDocument();
+        return other;
+    }
+    return report;
+}
+
+UReportDoc *DeskFrame::read(const QString &file, const std::function<UReportDoc *()> &open)
+{
+    reading_.append(file);
+    files_.expect(file);
+    UReportDoc *report = open();
+    reading_.removeOne(file);
+    if (report == nullptr) {
+        files_.ceaseToExpect(file);
+    }
+    return report;
+}
+
+void DeskFrame::NoteDocumentEvent(UDocument &document, UDocument::DocumentEvent event)
+{
+    if (event == UDocument::DocumentEvent::AfterCloseDocument) {
+        recovery_.forget(dynamic_cast<const UReportDoc *>(&document));
+        editors_.forget(dynamic_cast<const UReportDoc *>(&document));
+    }
+    // A document that has just been opened or saved under a new name gets its path after the event.
+    QMetaObject::invokeMethod(
+        this,
+        [this, event, &document] {
+            QStringList paths;
+            for (const UDocument *open : UApplication::Get()->GetDocuments()) {
+                paths.append(open->GetPathName());
+            }
+            files_.retain(paths);
+            if (event == UDocument::DocumentEvent::AfterCloseDocument || !UApplication::Get()->IsOpen(&document)) {
+                return;
+            }
+            const QString path = document.GetPathName();
+            // Only a file that was saved here is known to be unchanged: a file that was read may have changed since.
+            const bool isNew = event == UDocument::DocumentEvent::AfterSaveDocument || !files_.isWatched(path);
+            if (isNew && !path.isEmpty() && !kareport::isPdfName(path)) {
+                files_.watch(path);
+            }
+        },
+        Qt::QueuedConnection);
+}
+
+void DeskFrame::loadAgain(UReportDoc &report)
+{
+    const QString path = report.GetPathName();
+    kareport::ReadNotes notes;
+    const bool isLoaded = kareport::reloadSavedReport(report, &notes);
+    if (isLoaded) {
+        sayWhatIsNotShown(path, notes);
+        return;
+    }
+    if (UReportDoc::IsReportAvailable(&report)) {
+        report.SetModifiedFlag(true); // what is shown is not in any file any more
+        if (!notes.isStopped) {
+            const QString reason = kareport::whyNotOpened(path);
+            AppMessageBox(reason.isEmpty() ? whyNotRead(path, notes) : reason);
+        }
+    }
+}
+
+void DeskFrame::fileChanged(const QString &path)
+{
+    for (UDocument *open : UApplication::Get()->GetDocuments()) {
+        auto *document = dynamic_cast<UReportDoc *>(open);
+        if (document == nullptr || document->GetPathName() != path) {
+            continue;
+        }
+        const QString question = document->IsModified()
+                                     ? Xlate("\"%1\" was changed by another program, and it has unsaved changes here. "
+                                             "Load it again and lose the changes made here?")
+                                     : Xlate("\"%1\" was changed by another program. Load it again?");
+        const MessageAnswer answer = kareport::showMessage(
+            {question.arg(path), QString(), MessageButtons::YesNo, kareport::MessageIcon::Question});
+        if (answer == MessageAnswer::Yes && UApplication::Get()->IsOpen(document)) {
+            loadAgain(*document);
+        }
+        return;
+    }
+}
