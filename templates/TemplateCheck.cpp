@@ -4,6 +4,7 @@
 #include "LeadingInteger.h"
 #include "MemoryLasts.h"
 #include "ScanNoteText.h"
+#include "StandardText.h"
 #include "TagLint.h"
 #include "TemplateElements.h"
 #include "TemplateRecords.h"
