@@ -5,7 +5,6 @@
 #include "PrintQt.h"
 
 #include <QApplication>
-#include <QElapsedTimer>
 #include <QFile>
 #include <QFileInfo>
 #include <QPrinter>
@@ -141,13 +140,14 @@ TEST(PrintJob, WindowsAnswerWhileItPrintsAndTheProgressIsShown)
     PagedText text;
     NumberedPages pages(200);
     pages.delay = 3;
-    QElapsedTimer sinceAnswer;
-    qint64 longest = 0;
+    std::size_t pagesAtAnswer = 0;
+    std::size_t mostPages = 0; // between two answers: on a busy machine, each of them takes longer
     int answers = 0;
     QStringList labels;
     QTimer timer;
     QObject::connect(&timer, &QTimer::timeout, [&] {
-        longest = std::max(longest, sinceAnswer.restart());
+        mostPages = std::max(mostPages, pages.printed.size() - pagesAtAnswer);
+        pagesAtAnswer = pages.printed.size();
         ++answers;
         if (const QProgressDialog *window = progressWindow()) {
             labels += window->labelText();
@@ -155,10 +155,9 @@ TEST(PrintJob, WindowsAnswerWhileItPrintsAndTheProgressIsShown)
         }
     });
     timer.start(5);
-    sinceAnswer.start();
     EXPECT_EQ(kareport::printPages(text.printer(), pages.source, nullptr).result, PrintResult::Done);
     EXPECT_GT(answers, 8);
-    EXPECT_LT(longest, 100);
+    EXPECT_LT(mostPages, 100U / 3) << "of 3 ms each: a window that is not served for 100 ms seems to hang";
     ASSERT_FALSE(labels.isEmpty());
     EXPECT_TRUE(labels.last().endsWith(QStringLiteral(" of 200"))) << labels.last().toStdString();
     EXPECT_EQ(progressWindow(), nullptr) << "gone with the job";
