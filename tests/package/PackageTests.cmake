@@ -25,7 +25,7 @@ add_test(NAME package.own-host COMMAND ${outside}/own-host-program ${CMAKE_CURRE
 add_test(NAME package.standalone COMMAND ${outside}/standalone)
 add_test(NAME package.headers COMMAND ${CMAKE_COMMAND} --build ${outside} --target headers)
 set_tests_properties(package.own-host package.standalone package.headers PROPERTIES FIXTURES_REQUIRED package.built)
-set_tests_properties(package.headers PROPERTIES LABELS heavy TIMEOUT 900)
+set_tests_properties(package.headers PROPERTIES TIMEOUT 900)
 add_test(NAME package.pkg-config COMMAND ${CMAKE_CURRENT_SOURCE_DIR}/package/pkg-config-test.sh ${CMAKE_CXX_COMPILER}
          ${prefix}/${CMAKE_INSTALL_LIBDIR} ${outside} ${PROJECT_VERSION})
 # The example host is built and run in the same way, as its guide says.
@@ -41,3 +41,7 @@ set_tests_properties(package.example.plain PROPERTIES FIXTURES_REQUIRED package.
 set_tests_properties(package.binaries package.exports package.use package.pkg-config package.example
                      PROPERTIES FIXTURES_REQUIRED package)
 add_test(NAME package.api COMMAND ${PROJECT_SOURCE_DIR}/scripts/api-docs.sh ${CMAKE_CURRENT_BINARY_DIR}/package/api)
+
+# They build programs outside, which takes longer than all the rest.
+set_tests_properties(package.use package.own-host package.standalone package.headers package.pkg-config package.example
+                     package.example.plain PROPERTIES LABELS heavy)
