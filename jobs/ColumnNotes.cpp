@@ -1,5 +1,6 @@
 #include "ColumnNotes.h"
 
+#include "FieldMarker.h"
 #include "NearestName.h"
 #include "TextFolding.h"
 #include "Xlate.h"
@@ -82,18 +83,24 @@ std::vector<UnfilledField> unfilledFields(const SourceColumns &columns, const sX
     const QStringList unread = unreadNames(columns);
     QStringList seen;
     for (const sXmlReportField &field : fields) {
-        // What marks or fills a column is no variable, and the check of templates says which names are none by mistake.
         // Of several variables with one name the last counts.
         const auto variable = std::find_if(
             dictionary.Variables.rbegin(), dictionary.Variables.rend(),
             [&field](const sXmlReportVariable &other) { return equalFolded(other.VariableName, field.VariableName); });
-        if (variable == dictionary.Variables.rend() || seen.contains(foldedKey(field.VariableName))) {
+        // A marker, or a label without a variable, is filled by no column.
+        if (field.VariableName.isEmpty() || fieldMarker(field.VariableName) != FieldMarker::None ||
+            seen.contains(foldedKey(field.VariableName)))
+        {
             continue;
         }
         seen.append(foldedKey(field.VariableName));
+        if (variable == dictionary.Variables.rend()) {
+            unfilled.push_back({field.VariableName, didYouMean(field.VariableName, variableNames(dictionary)), false});
+            continue;
+        }
         const auto id = static_cast<unsigned>(variable->ID);
         if (std::find(columns.ids.begin(), columns.ids.end(), id) == columns.ids.end()) {
-            unfilled.push_back({field.VariableName, didYouMean(field.VariableName, unread)});
+            unfilled.push_back({field.VariableName, didYouMean(field.VariableName, unread), true});
         }
     }
     return unfilled;

@@ -30,7 +30,8 @@ struct StepNotes
 struct UnfilledField
 {
     QString variable;
-    QString question; ///< which column may have been meant, as a question; empty for none
+    QString question; ///< which column or variable may have been meant, as a question; empty for none
+    bool isVariable;  ///< of the dictionary
 };
 
 /// The names of the variables of a dictionary, in its order.
@@ -42,7 +43,7 @@ std::vector<JobNote> unknownColumns(const SourceColumns &columns, const sXmlRepo
 /// The keys of the units that numbers of the data are taken to be in, as nobody has said them.
 QStringList assumedUnits(const SourceColumns &columns, const sXmlReportDictionary &dictionary, const DataUnits &units);
 
-/// The fields of a table or block whose variable is read from no column, each variable once.
+/// The fields of a table or block whose variable is read from no column, or is not in the dictionary, each variable once.
 std::vector<UnfilledField> unfilledFields(const SourceColumns &columns, const sXmlReportFields &fields,
                                           const sXmlReportDictionary &dictionary);
 

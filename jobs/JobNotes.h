@@ -3,6 +3,7 @@
 #include "InputError.h"
 
 #include <QByteArray>
+#include <QHash> // std::hash<QString>
 #include <QString>
 
 #include <unordered_set>
@@ -18,7 +19,7 @@ struct JobNote
     enum class Kind
     {
         UnknownColumn, ///< a column that is no variable, so that nobody reads it
-        UnfilledField, ///< a field whose variable is in no column, so that it shows nothing or zero
+        UnfilledField, ///< a field whose variable is in no column or no dictionary, so that it shows nothing or zero
         WideValue,     ///< values wider than their column
         MissingValue,  ///< values that are not there and show as 0
         Difference,    ///< what does not fit together in the data itself

@@ -178,7 +178,10 @@ JobSteps::Wrong JobSteps::noteColumns(const RowList &rows, const QString &data, 
     const auto unfilled = unfilledFields(*columns, record.Fields, dictionary);
     for (const UnfilledField &field : unfilled) {
         const QString sentence =
-            Xlate("no column fills the field \"%1\" of the %2 \"%3\"").arg(field.variable, what, record.Name);
+            field.isVariable
+                ? Xlate("no column fills the field \"%1\" of the %2 \"%3\"").arg(field.variable, what, record.Name)
+                : Xlate("the field \"%1\" of the %2 \"%3\" is not a variable of the dictionary \"%4\"")
+                      .arg(field.variable, what, record.Name, record.Use);
         const auto note = source_.errorAt(
             path, field.question.isEmpty() ? sentence : sentence + QStringLiteral(": ") + field.question);
         auto other = notes_.add({{JobNote::Kind::UnfilledField, note}});

@@ -1878,6 +1878,11 @@
     </message>
     <message>
         <location filename="../jobs/JobSteps.cpp"/>
+        <source>the field "%1" of the %2 "%3" is not a variable of the dictionary "%4"</source>
+        <translation>das Feld „%1“ (%2 „%3“) ist keine Variable des Wörterbuchs „%4“</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobSteps.cpp"/>
         <source>the data "%1" does not say the unit of its numbers: %2 was taken</source>
         <translation>die Daten „%1“ sagen die Einheit ihrer Zahlen nicht: %2 wurde angenommen</translation>
     </message>

@@ -1878,6 +1878,11 @@
     </message>
     <message>
         <location filename="../jobs/JobSteps.cpp"/>
+        <source>the field "%1" of the %2 "%3" is not a variable of the dictionary "%4"</source>
+        <translation>%2「%3」の項目「%1」は辞書「%4」の変数ではありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobSteps.cpp"/>
         <source>the data "%1" does not say the unit of its numbers: %2 was taken</source>
         <translation>データ「%1」は数値の単位を示していません: %2 とみなしました</translation>
     </message>

@@ -200,7 +200,7 @@ CLI::App *addRender(CLI::App &program, RenderOptions &options)
         "  kareport render stakeout.json -o - | less\n"
         "  kareport render stakeout.json --set settings.lengthUnit=usft -o stakeout-ft.rep\n"
         "  kareport render --template survey.xml --name CONTROL --table Points --data points.csv -o points.txt\n"
-        "  total-station | kareport render -t survey.xml -n CONTROL --table Points --data - --order PNEZD\n"
+        "  total-station | kareport render -t survey.xml -n CONTROL --table Points --data - --no-header --order PNEZD\n"
         "  kareport render jobs/*.json -o 'sheets/{}.pdf'\n"
         "  find jobs -name '*.json' | sort | kareport render --jobs - --slice 1/8 --update");
     return render;

@@ -90,6 +90,45 @@ TEST(JobNotes, SayWhatDoesNotComeTogether)
     }
 }
 
+TEST(JobNotes, SayWhichFieldsHaveNoVariable)
+{
+    struct Row
+    {
+        const char *field; ///< in the place of the field of Northing
+        const char *expected;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {"Nortihng",
+         "job.json:1:#: note: the field \"Nortihng\" of the table \"Points\" is not a variable of the dictionary "
+         "\"Survey\": did you mean \"Northing\"?",
+         "misspelt: it would show 0 in every row"},
+        {"Gradient",
+         "job.json:1:#: note: the field \"Gradient\" of the table \"Points\" is not a variable of the dictionary "
+         "\"Survey\"",
+         "nothing near"},
+        {"FILLER", "", "blanks are what is wanted"},
+        {"NORTHING", "", "names count without their case"},
+    };
+    for (const Row &row : rows) {
+        TestJob job;
+        putData(job);
+        QByteArray content = jobs::pointsTemplate();
+        const QByteArray was = markup::element("VariableName", "Northing") + markup::element("Label", "North");
+        ASSERT_TRUE(content.contains(was));
+        content.replace(content.indexOf(was), was.size(),
+                        markup::element("VariableName", row.field) + markup::element("Label", "North"));
+        job.folder.put("t.xml", content);
+        job.run(templateJob(R"("p": {"csv": "good.csv"})", tableStep));
+        EXPECT_FALSE(job.error) << row.reason << ": " << job.text().toStdString();
+        QString notes = QString::fromStdString(notesOf(job));
+        notes.replace(QRegularExpression(QStringLiteral("job\\.json:1:\\d+")), QStringLiteral("job.json:1:#"));
+        EXPECT_EQ(notes.toStdString(), row.expected) << row.reason;
+        job.run(R"("strict": true, )" + templateJob(R"("p": {"csv": "good.csv"})", tableStep));
+        EXPECT_EQ(job.error.has_value(), *row.expected != 0) << row.reason << ": an error of a strict job";
+    }
+}
+
 TEST(JobNotes, SayWhichValuesDoNotShowAsTheyAre)
 {
     struct Row
