@@ -17,7 +17,7 @@ public:
     JobWithoutMemory() { folder_.put("t.xml", jobs::pointsTemplate()); }
 
     /// @param then  the step after the first
-    /// @return whether it ended for want of memory
+    /// @return whether it ended because memory ran out
     bool fails(const QByteArray &then)
     {
         const QByteArray full(31'900, 'x');
