@@ -11,16 +11,15 @@ namespace
 
 constexpr int mostColumns = 10'000;
 
-std::optional<ColumnChoice> readColumnChoice(const QString &variable, const JsonNode &node)
+void addColumnChoice(std::vector<ColumnChoice> &choices, const QString &variable, const JsonNode &node)
 {
     if (node.value().isDouble()) {
-        return ColumnChoice{variable, node.whole(1, 1, mostColumns)};
-    }
-    if (!node.value().isString() || node.text().isEmpty()) {
+        choices.push_back({variable, node.whole(1, 1, mostColumns)});
+    } else if (node.value().isString() && !node.text().isEmpty()) {
+        choices.push_back({variable, node.text()});
+    } else {
         node.fail(Xlate("the name of a column, or its number from 1, was expected"));
-        return std::nullopt;
     }
-    return ColumnChoice{variable, node.text()};
 }
 
 } // namespace
@@ -32,9 +31,7 @@ std::vector<ColumnChoice> readColumnChoices(const JsonNode &node)
         return choices;
     }
     for (const QString &variable : node.keys()) {
-        if (auto choice = readColumnChoice(variable, node[variable])) {
-            choices.push_back(*std::move(choice));
-        }
+        addColumnChoice(choices, variable, node[variable]);
     }
     return choices;
 }

@@ -5,29 +5,34 @@ namespace kareport
 
 void LandXmlPointTable::add(const LandXmlPoint &point)
 {
-    points_.try_emplace(point.name, point.at);
+    byName_.try_emplace(point.name, point.at);
     if (!point.id.empty()) {
-        points_.try_emplace(point.id, point.at);
+        byId_.try_emplace(point.id, point.at);
     }
+}
+
+const LandXmlCoordinates *LandXmlPointTable::coordinatesOf(std::string_view name) const
+{
+    if (const auto point = byName_.find(name); point != byName_.end()) {
+        return &point->second;
+    }
+    const auto point = byId_.find(name);
+    return point != byId_.end() ? &point->second : nullptr;
 }
 
 std::optional<LandXmlPointTable::Found> LandXmlPointTable::find(std::string_view name) const
 {
     std::string_view next = name;
-    for (std::size_t step = 0; step <= points_.size(); ++step) {
-        const auto point = points_.find(next);
-        if (point == points_.end()) {
+    constexpr int longestChain = 100;
+    for (int step = 0; step <= longestChain; ++step) {
+        const LandXmlCoordinates *at = coordinatesOf(next);
+        if (at == nullptr) {
             return std::nullopt;
         }
-        const LandXmlCoordinates &at = point->second;
-        if (at.position) {
-            return Found{*at.position, at.height};
+        if (at->position) {
+            return Found{*at->position, at->height};
         }
-        next = at.reference;
-        constexpr std::size_t longestChain = 100;
-        if (step == longestChain) {
-            return std::nullopt;
-        }
+        next = at->reference;
     }
     return std::nullopt;
 }

@@ -14,7 +14,8 @@ namespace kareport
 class LandXmlPointTable
 {
 public:
-    /// Adds a point under its name and its identifier. Where several have a name, the first stands for it.
+    /// Adds a point under its name and its identifier. Of several points with one name the first is found. A name counts
+    /// before an identifier: many programs number both, from different points.
     void add(const LandXmlPoint &point);
 
     struct Found
@@ -32,7 +33,11 @@ private:
         using is_transparent = void;
     };
 
-    std::unordered_map<std::string, LandXmlCoordinates, Hash, std::equal_to<>> points_;
+    const LandXmlCoordinates *coordinatesOf(std::string_view name) const;
+
+    using Points = std::unordered_map<std::string, LandXmlCoordinates, Hash, std::equal_to<>>;
+    Points byName_;
+    Points byId_;
 };
 
 } // namespace kareport

@@ -206,7 +206,13 @@ bool StationRows::addRound(const LandXmlRoute &route, std::vector<double> &dista
         const double last = first + (stationing.internalIn(region, first + 1) < from ? from - to : to - from);
         const double low = std::ceil(std::min(first, last) / interval - 1e-9);
         const double high = std::floor(std::max(first, last) / interval + 1e-9);
-        for (double number = low; number <= high; number += 1) {
+        // Far from 0 neighbouring multiples are one number, and stations may be infinite: what is counted is their difference.
+        const double count = high - low + 1;
+        if (!(count + static_cast<double>(rows_.size() + distances.size()) < most)) {
+            return false;
+        }
+        for (qint64 i = 0; i < static_cast<qint64>(count); ++i) {
+            const double number = low + static_cast<double>(i);
             distances.push_back(stationing.internalIn(region, number * interval) - stationing.start());
         }
     }

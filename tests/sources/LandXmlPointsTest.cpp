@@ -114,6 +114,12 @@ TEST(LandXmlPoints, MayReferToOthers)
         fileOf("<CgPoints><CgPoint name='a' pntRef='7'/><CgPoint name='b' oID='7'>5 6</CgPoint></CgPoints>"),
         queryOf(Kind::Points), {QStringLiteral("Name"), QStringLiteral("Northing")});
     EXPECT_EQ(byId.rows(0), QStringList({u"a|5"_qs, u"b|5"_qs}));
+    LandXmlFile numbered(
+        fileOf("<CgPoints><CgPoint name='2' oID='1'>10 10</CgPoint><CgPoint name='1' oID='2'>20 20</CgPoint>"
+               "<CgPoint name='a' pntRef='1'/></CgPoints>"),
+        queryOf(Kind::Points), {QStringLiteral("Name"), QStringLiteral("Northing")});
+    EXPECT_EQ(numbered.rows(0), QStringList({u"2|10"_qs, u"1|20"_qs, u"a|20"_qs}))
+        << "a name counts before an identifier";
     for (const char *wrong : {"<CgPoint name='a' pntRef='x'/>", "<CgPoint name='a' pntRef='a'/>",
                               "<CgPoint name='a' pntRef='b'/><CgPoint name='b' pntRef='a'/>"})
     {

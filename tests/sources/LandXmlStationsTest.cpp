@@ -91,6 +91,19 @@ TEST(LandXmlStations, RoundOnesAreRoundInEachRegion)
               QStringList({u"0.000"_qs, u"25.000"_qs, u"90.000"_qs, u"75.000"_qs, u"50.000"_qs, u"25.000"_qs}));
 }
 
+TEST(LandXmlStations, RoundOnesEndWhereverTheyBegin)
+{
+    LandXmlQuery query = everyTenth();
+    query.fromRound = true;
+    // Beyond 2 to the power of 53 the next multiple is the same number.
+    for (const char *start : {"name='road' staStart='1e18'", "name='road' staStart='-1e18'"}) {
+        EXPECT_LT(stationsOf(fileOf(alignment(straight, start)), query).size(), 100) << start;
+    }
+    LandXmlFile infinite(fileOf(alignment(straight, "name='road' staStart='INF'")), query);
+    EXPECT_EQ(infinite.rows(), QStringList());
+    EXPECT_TRUE(infinite.list->error()) << "there are no stations to count";
+}
+
 TEST(LandXmlStations, ThatAreListedAreWhereverTheirNumberIs)
 {
     LandXmlQuery query = queryOf(Kind::Stations);
