@@ -50,22 +50,38 @@ qint64 startOfBlock(const QTextBlock &block)
 
 std::vector<int> blocksAt(const QTextDocument &document, const std::vector<qint64> &starts)
 {
+    const int count = document.blockCount();
+    const auto startOf = [&document](int number) { return startOfBlock(document.findBlockByNumber(number)); };
     std::vector<int> blocks;
-    int first = 0;
+    int first = 0; // no block before it begins at the start or after it
+    int distance = 1;
     for (const qint64 start : starts) {
-        int last = document.blockCount();
-        while (first < last) {
-            const int middle = first + (last - first) / 2;
-            if (startOfBlock(document.findBlockByNumber(middle)) < start) {
-                first = middle + 1;
+        // Nearly all pages have as many lines as the page before: looking there first makes a long report's pages cost
+        // one search each, which else would be a pause of the window.
+        int last = first + distance < count ? first + distance : count;
+        int from = first;
+        while (last < count && startOf(last) < start) {
+            from = last + 1;
+            distance *= 2;
+            last = from < count - distance ? from + distance : count;
+        }
+        if (last < count && startOf(last) == start) {
+            from = last;
+        }
+        while (from < last) {
+            const int middle = from + (last - from) / 2;
+            if (startOf(middle) < start) {
+                from = middle + 1;
             } else {
                 last = middle;
             }
         }
-        const QTextBlock block = document.findBlockByNumber(first);
-        if (block.isValid() && startOfBlock(block) == start) {
-            blocks.push_back(first);
+        const bool isThere = from < count && startOf(from) == start;
+        if (isThere) {
+            blocks.push_back(from);
         }
+        distance = std::max(from - first, 1);
+        first = from;
     }
     return blocks;
 }
