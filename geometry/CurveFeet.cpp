@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <limits>
 
 namespace kareport
 {
@@ -29,7 +30,9 @@ CurveFeet feetOnArc(const PlaneCurve &curve, PlanePoint point)
     const double fromCentre = std::hypot(sine, cosine);
     const double radius = 1 / std::fabs(curvature);
     CurveFeet found;
-    if (fromCentre * radius < 10 * placeRounding) {
+    // Of a large circle, the last digits of the radius say no more.
+    const double nearCentre = std::max(10 * placeRounding, 8 * std::numeric_limits<double>::epsilon() * radius);
+    if (fromCentre * radius < nearCentre) {
         found.isUndetermined = true;
         return found;
     }
@@ -49,8 +52,8 @@ CurveFeet feetOnArc(const PlaneCurve &curve, PlanePoint point)
     return found;
 }
 
-/// Searches a transition for places from which a point is neither ahead nor back. Stretches without one are found by how
-/// fast that can change at most; a stretch along which it only falls or only rises has one or none.
+/// Searches a transition for places from which a point is neither ahead nor back. How fast it can come nearer at most tells
+/// which stretches have no such place; a stretch along which it only comes nearer, or only goes farther, has one or none.
 class TransitionSearch
 {
 public:

@@ -2,6 +2,7 @@
 
 #include "Alignment.h"
 
+#include <cstddef>
 #include <optional>
 #include <vector>
 
@@ -29,7 +30,34 @@ struct AlignmentFoot
 
 /// All places of an alignment to which a point may belong, the nearest first.
 std::vector<AlignmentFoot> feetOn(const Alignment &alignment, PlanePoint point);
-/// The nearest of them. Elements that are farther away cost next to nothing.
+/// The nearest of them; nothing where the numbers are too large to have one, and on an alignment without elements. For many
+/// points, `NearestFoot` is faster.
 std::optional<AlignmentFoot> nearestFoot(const Alignment &alignment, PlanePoint point);
+
+/// Finds the nearest places of many points. What a point costs grows with the logarithm of the number of elements.
+class NearestFoot
+{
+public:
+    /// @param alignment  must live as long, without a change
+    explicit NearestFoot(const Alignment &alignment);
+
+    std::optional<AlignmentFoot> of(PlanePoint point) const;
+
+private:
+    /// What an element, or those under a node, lie in.
+    struct Box
+    {
+        PlanePoint low;
+        PlanePoint high;
+    };
+    class Search;
+
+    static Box boxOf(const Alignment::Element &element);
+    static Box boxAround(const Box &left, const Box &right);
+
+    const Alignment &alignment_;
+    std::size_t leaves_;     ///< the elements and empty ones up to a power of two
+    std::vector<Box> boxes_; ///< of a binary tree: the root at 1, the two below a node at twice its index
+};
 
 } // namespace kareport

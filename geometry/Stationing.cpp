@@ -16,9 +16,9 @@ constexpr double rounding = 1e-7;
 
 bool Stationing::add(const StationEquation &equation)
 {
-    const double before = equations_.empty() ? start_ : equations_.back().internal;
-    if (!std::isfinite(equation.internal) || !std::isfinite(equation.ahead) || !(equation.internal > before + rounding))
-    {
+    const bool isAhead = equations_.empty() ? equation.internal >= start_ - rounding
+                                            : equation.internal > equations_.back().internal + rounding;
+    if (!std::isfinite(equation.internal) || !std::isfinite(equation.ahead) || !isAhead) {
         return false;
     }
     equations_.push_back(equation);

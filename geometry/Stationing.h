@@ -15,7 +15,7 @@ struct StationEquation
 };
 
 /// Names of places along an alignment with station equations. Between the equations there are regions, counted from 0: a
-/// number may stand for places in several of them, or for none.
+/// number may name places in several of them, or none.
 class Stationing
 {
 public:
@@ -28,8 +28,9 @@ public:
     /// @param start  the station of the alignment's start
     explicit Stationing(double start) : start_(start) {}
 
-    /// Adds an equation ahead of those that there are. @return false, and nothing is added, where a number is not finite or
-    /// the equation is not ahead of the start and of the others
+    /// Adds an equation ahead of the others. The first one may be at the start, whose name back is then the station of the
+    /// start. @return false, and nothing is added, where a number is not finite, or the equation is before the start or not
+    /// ahead of the others
     bool add(const StationEquation &equation);
 
     double start() const { return start_; }
@@ -37,10 +38,10 @@ public:
 
     /// The station of a place. @param back  on an equation, the name that the place has before it
     Name nameOf(double internal, bool back = false) const;
-    /// The place that a station stands for in a region; the region's borders belong to it. It may be outside the region:
-    /// there the station stands for no place of it.
+    /// The place that a station names in a region; the region's borders belong to it. It may be outside the region: then the
+    /// station names no place of it.
     double internalIn(std::size_t region, double station) const;
-    /// All places that a station stands for, in turn, up to an end of the alignment. A place on an equation whose two names
+    /// All places that a station names, in turn, up to an end of the alignment. A place on an equation whose two names
     /// are equal is there once.
     std::vector<double> placesOf(double station, double endInternal) const;
     /// The equation that a place is on, or null.

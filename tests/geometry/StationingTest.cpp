@@ -109,7 +109,6 @@ TEST(Stationing, GoingThereAndBack)
 TEST(Stationing, EquationsOutOfOrderAreRefused)
 {
     Stationing stations(10);
-    EXPECT_FALSE(stations.add({10, 20})) << "at the start there is nothing before it";
     EXPECT_FALSE(stations.add({5, 20})) << "before the start";
     EXPECT_TRUE(stations.add({30, 20}));
     EXPECT_FALSE(stations.add({30, 40})) << "the same place again";
@@ -117,6 +116,20 @@ TEST(Stationing, EquationsOutOfOrderAreRefused)
     EXPECT_FALSE(stations.add({std::numeric_limits<double>::quiet_NaN(), 40}));
     EXPECT_FALSE(stations.add({40, std::numeric_limits<double>::infinity()}));
     EXPECT_EQ(stations.equations().size(), 1U);
+}
+
+TEST(Stationing, AnEquationMayBeAtTheStart)
+{
+    Stationing stations(10);
+    ASSERT_TRUE(stations.add({10, 500}));
+    EXPECT_FALSE(stations.add({10, 600})) << "a second one may not";
+    EXPECT_EQ(stations.nameOf(10).station, 500);
+    EXPECT_EQ(stations.nameOf(10).region, 1U);
+    EXPECT_EQ(stations.nameOf(10, true).station, 10);
+    EXPECT_EQ(stations.nameOf(12).station, 502);
+    EXPECT_EQ(stations.placesOf(10, 100), std::vector<double>{10}) << "the name of the start";
+    EXPECT_EQ(stations.placesOf(11, 100), std::vector<double>{});
+    EXPECT_EQ(stations.placesOf(501, 100), std::vector<double>{11});
 }
 
 } // namespace
