@@ -75,7 +75,7 @@ constexpr struct
             {"from", uses::places},         {"atElements", uses::places},   {"stations", uses::places},
             {"offsets", uses::places}};
 
-/// Fails at a key that the list has no use for: who reads the job would believe that it does something.
+/// Fails at a key that the list has no use for: a reader of the job would believe that it does something.
 void expectKeysOf(const JsonNode &set, unsigned used, QStringView list)
 {
     for (const auto &row : keys) {
@@ -191,6 +191,17 @@ QStringList landXmlQueryKeys()
     }
     all.append(QStringLiteral("tolerance"));
     return all;
+}
+
+QStringList landXmlKeysOf(LandXmlListKind kind)
+{
+    QStringList used;
+    for (const auto &row : keys) {
+        if ((usesOf(kind) & row.use) != 0) {
+            used.append(QString::fromLatin1(row.key));
+        }
+    }
+    return used;
 }
 
 LandXmlQuery readLandXmlQuery(const JsonNode &set)

@@ -5,6 +5,32 @@
 namespace kareport
 {
 
+namespace
+{
+
+/// Whether an XML file declares an encoding of one byte a character. Each encoding that is read, but for UTF-8 and UTF-16, is
+/// one.
+bool declaresOneByteCharacters(std::string_view bytes)
+{
+    constexpr std::size_t longest = 200;
+    const std::string_view begin = bytes.substr(0, longest);
+    const std::string_view declaration = begin.substr(0, begin.find("?>"));
+    constexpr std::string_view keyword = "encoding";
+    const std::size_t at = declaration.find(keyword);
+    if (!declaration.starts_with("<?xml") || at == std::string_view::npos) {
+        return false;
+    }
+    const std::size_t quote = declaration.find_first_of("\"'", at);
+    const std::string_view name = declaration.substr(std::min(quote, declaration.size() - 1) + 1, 3);
+    return name != "UTF" && name != "utf" && name != "Utf";
+}
+
+} // namespace
+
+FilePlaces::FilePlaces(const FileBytes &file)
+    : file_(file), hasOneByteCharacters_(declaresOneByteCharacters(file.view()))
+{}
+
 TextPlace FilePlaces::of(std::size_t byte)
 {
     const std::string_view bytes = file_.view();
@@ -40,8 +66,9 @@ void FilePlaces::walk(std::size_t end)
         place_.column = 1;
         piece.remove_prefix(piece.rfind('\n') + 1);
     }
-    place_.column += std::count_if(piece.begin(), piece.end(),
-                                   [](char unit) { return (static_cast<unsigned char>(unit) & 0xC0U) != 0x80U; });
+    place_.column += std::count_if(piece.begin(), piece.end(), [this](char unit) {
+        return hasOneByteCharacters_ || (static_cast<unsigned char>(unit) & 0xC0U) != 0x80U;
+    });
     at_ = end;
 }
 

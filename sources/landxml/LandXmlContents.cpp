@@ -28,6 +28,34 @@ private:
     std::unordered_map<std::string, std::size_t> indexes_;
 };
 
+/// Looks at the outermost element alone.
+class RootReader : public XmlHandler
+{
+public:
+    explicit RootReader(const std::shared_ptr<const FileBytes> &file) : stream_(file, *this) {}
+
+    bool isLandXml()
+    {
+        while (stream_.readSome()) {
+        }
+        return isLandXml_;
+    }
+
+    Interest startElement(std::string_view name, const XmlAttributes &) override
+    {
+        isLandXml_ = name == "LandXML";
+        stream_.stop();
+        return Interest::None;
+    }
+    void endElement() override {}
+    void text(std::string_view) override {}
+    void foreignElement(std::string_view) override {}
+
+private:
+    XmlStream stream_;
+    bool isLandXml_ = false;
+};
+
 void addAlignments(LandXmlContents &contents, const std::vector<LandXmlAlignment> &alignments)
 {
     NamesOnce surfaceLines(contents.surfaceLines);
@@ -39,6 +67,7 @@ void addAlignments(LandXmlContents &contents, const std::vector<LandXmlAlignment
         for (const LandXmlHeightLine &line : alignment.surfaceLines) {
             surfaceLines.add(line.name, line.points.size());
         }
+        contents.sections += alignment.sections.size();
         for (const LandXmlSection &section : alignment.sections) {
             for (const LandXmlSectionSurface &surface : section.surfaces) {
                 surfaceLines.add(surface.name, surface.points.size());
@@ -48,6 +77,11 @@ void addAlignments(LandXmlContents &contents, const std::vector<LandXmlAlignment
 }
 
 } // namespace
+
+bool isLandXml(const std::shared_ptr<const FileBytes> &file)
+{
+    return RootReader(file).isLandXml();
+}
 
 Expected<LandXmlContents> readLandXmlContents(const std::shared_ptr<const FileBytes> &file,
                                               const ReadProgress &progress)

@@ -28,7 +28,11 @@ struct LandXmlContents
     std::vector<LandXmlNamed> gradeLines;
     std::vector<LandXmlNamed> surfaceLines; ///< surfaces along and across alignments, each name once
     std::vector<LandXmlNamed> parcels;
+    std::size_t sections = 0; ///< cross sections of all alignments
 };
+
+/// Whether a file is a LandXML file by its outermost element.
+bool isLandXml(const std::shared_ptr<const FileBytes> &file);
 
 /// Reads what a file holds.
 /// @param progress  is told how many bytes have been read; false ends the reading, with what was read until then

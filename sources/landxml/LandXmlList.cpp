@@ -98,14 +98,16 @@ UDataObject *LandXmlList::GetAt(std::size_t index)
 void LandXmlList::rewind()
 {
     batches_.reset();
-    rows_->rewind();
+    if (!order_) { // a sorted list asks for its rows by their numbers, and its notes are complete
+        rows_->rewind();
+    }
     nextOrdered_ = 0;
     error_.reset();
     batch_ = nullptr;
     batchStart_ = 0;
 }
 
-/// Why the rows end where they do. What was cut off the file while it was read shows as rows that are wrong.
+/// Why the rows end where they do. Bytes that were cut off the file while it was read look like rows that are wrong.
 std::optional<InputError> LandXmlList::endOfRows(const std::optional<InputError> &error) const
 {
     const auto lost = file_->lostBytes();

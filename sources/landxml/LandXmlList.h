@@ -15,11 +15,11 @@ namespace kareport
 {
 
 /// The rows of a LandXML file as data objects, made while they are asked for in turn: only a few objects exist at a time,
-/// and of points not even the file. Progress is told in bytes.
+/// and a list of points does not keep the file in memory either. Progress is told in bytes.
 class LandXmlList : public RowList
 {
 public:
-    /// Reads the file up to its units. Variables that the dictionary does not know are passed over.
+    /// Reads the file up to its units. Variables that the dictionary does not know are left out.
     /// @param findVariable  gives parsers for the units of `units()`
     LandXmlList(std::shared_ptr<const FileBytes> file, LandXmlQuery query, const FindVariable &findVariable,
                 ReadProgress progress);
@@ -36,10 +36,10 @@ public:
     void Sort(const std::vector<unsigned> &ids) override;
 
     std::optional<InputError> error() const override { return error_; }
-    /// What there is to say of a file whose rows are sound: what differs, and the kinds of elements that no list reads.
-    /// Nothing before the rows have come to their end.
+    /// Differences in a file whose rows are sound, and the kinds of elements that no list reads. Nothing before the rows have
+    /// come to their end.
     std::vector<InputError> notes() const override;
-    /// The variables that rows of the query have. All are offered: nobody misses one that is not read.
+    /// The variables that rows of the query have. All are offered: one that is not read is not missed.
     std::optional<SourceColumns> columns() const override;
 
 private:

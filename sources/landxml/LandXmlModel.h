@@ -12,11 +12,11 @@
 namespace kareport
 {
 
-/// A number that a file does not say.
+/// A number that a file does not state.
 inline constexpr double notGiven = std::numeric_limits<double>::quiet_NaN();
 
 // What a LandXML file holds, as it is stored. Lengths are in metres, areas in square metres, angles and directions in
-// radians. Texts are in UTF-8. `byte` is where the element stands in the file.
+// radians. Texts are in UTF-8. `byte` is the place of the element in the file.
 
 /// Coordinates, or the name of the point that has them.
 struct LandXmlCoordinates
@@ -50,7 +50,7 @@ struct LandXmlElement
         IrregularLine,
         Curve,
         Spiral,
-        Other ///< has no geometry here, and its place in the alignment is not passed over
+        Other ///< of another kind: it has no geometry here, but its place in the alignment counts
     };
 
     Kind kind = Kind::Line;
@@ -66,7 +66,7 @@ struct LandXmlElement
     double directionEnd = notGiven;
     double delta = notGiven;
     LandXmlCoordinates start, end, centre, intersection;
-    std::vector<LandXmlCoordinates> between; ///< of an irregular line, points between start and end
+    std::vector<PlanePoint> between; ///< of an irregular line, points between start and end
     std::size_t byte = 0;
 };
 
@@ -107,11 +107,12 @@ struct LandXmlGradeLine
     std::size_t byte = 0;
 };
 
-/// Heights along an alignment, or across it: stations or offsets, each with its height.
+/// Heights along an alignment: stations, each with its height. There may be several pieces with gaps between them.
 struct LandXmlHeightLine
 {
     std::string name;
     std::vector<std::pair<double, double>> points;
+    std::vector<std::size_t> pieces; ///< indexes of the points that begin a piece
     std::size_t byte = 0;
 };
 

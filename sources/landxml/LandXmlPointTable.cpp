@@ -5,13 +5,27 @@ namespace kareport
 
 void LandXmlPointTable::add(const LandXmlPoint &point)
 {
-    byName_.try_emplace(point.name, point.at);
-    if (!point.id.empty()) {
-        byId_.try_emplace(point.id, point.at);
+    const std::string &reference = point.at.reference;
+    const bool isAlias = !point.at.position && (reference == point.name || reference == point.id);
+    if (isAlias || (point.name.empty() && point.id.empty())) {
+        return;
     }
+    const Entry &entry = points_.emplace_back(
+        Entry{point.at.position, point.at.height, reference, point.name, point.id, point.code, point.description});
+    addTo(byName_, entry.name, entry);
+    addTo(byId_, entry.id, entry);
 }
 
-const LandXmlCoordinates *LandXmlPointTable::coordinatesOf(std::string_view name) const
+void LandXmlPointTable::addTo(Entries &entries, std::string_view key, const Entry &entry)
+{
+    if (key.empty()) {
+        return;
+    }
+    const auto [known, isNew] = entries.try_emplace(key, Known{&entry, false});
+    known->second.isAmbiguous = !isNew;
+}
+
+const LandXmlPointTable::Known *LandXmlPointTable::known(std::string_view name) const
 {
     if (const auto point = byName_.find(name); point != byName_.end()) {
         return &point->second;
@@ -22,17 +36,28 @@ const LandXmlCoordinates *LandXmlPointTable::coordinatesOf(std::string_view name
 
 std::optional<LandXmlPointTable::Found> LandXmlPointTable::find(std::string_view name) const
 {
+    const auto take = [](std::string_view &text, const std::string &from) {
+        text = text.empty() ? std::string_view(from) : text;
+    };
+    Found found;
     std::string_view next = name;
     constexpr int longestChain = 100;
     for (int step = 0; step <= longestChain; ++step) {
-        const LandXmlCoordinates *at = coordinatesOf(next);
-        if (at == nullptr) {
+        const Known *point = known(next);
+        if (point == nullptr) {
             return std::nullopt;
         }
-        if (at->position) {
-            return Found{*at->position, at->height};
+        const Entry &entry = *point->entry;
+        take(found.name, entry.name);
+        take(found.code, entry.code);
+        take(found.description, entry.description);
+        found.isAmbiguous = found.isAmbiguous || point->isAmbiguous;
+        if (entry.position) {
+            found.position = *entry.position;
+            found.height = entry.height;
+            return found;
         }
-        next = at->reference;
+        next = entry.reference;
     }
     return std::nullopt;
 }

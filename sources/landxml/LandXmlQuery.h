@@ -1,6 +1,6 @@
 #pragma once
 
-#include "LandXmlGeometry.h"
+#include "LandXmlComparison.h"
 
 #include <QString>
 #include <QStringView>

@@ -10,84 +10,20 @@ namespace
 {
 
 constexpr std::size_t longestText = std::size_t(1) << 26;
+constexpr std::size_t allowedWeight = 1000000; // of small files, in addition to their bytes
 
 } // namespace
 
 LandXmlReader::LandXmlReader(std::shared_ptr<const FileBytes> file, const LandXmlUnits &units,
                              const LandXmlWants &wants, LandXmlNotes &notes)
-    : stream_(std::move(file), *this), units_(units), wants_(wants), notes_(notes)
+    : mostWeight_(allowedWeight + file->view().size()),
+      stream_(std::move(file), *this),
+      units_(units),
+      wants_(wants),
+      notes_(notes)
 {
     // They are parts of alignments.
     wants_.alignments = wants.alignments || wants.surfaceLines || wants.sections;
-}
-
-/// What an element is by its name and the element that it is in.
-LandXmlReader::Tag LandXmlReader::tagOf(Tag parent, std::string_view name)
-{
-    struct Row
-    {
-        Tag parent;
-        std::string_view name;
-        Tag tag;
-    };
-    static constexpr Row rows[] = {
-        {Tag::SurfacePoints, "P", Tag::SurfacePoint}, // first what there is most of
-        {Tag::Points, "CgPoint", Tag::Point},
-        {Tag::Root, "CgPoints", Tag::Points},
-        {Tag::Root, "Surfaces", Tag::Surfaces},
-        {Tag::Root, "Alignments", Tag::Alignments},
-        {Tag::Root, "Parcels", Tag::Parcels},
-        {Tag::Points, "CgPoints", Tag::Points},
-        {Tag::Surfaces, "Surface", Tag::Surface},
-        {Tag::Surface, "Definition", Tag::Definition},
-        {Tag::Definition, "Pnts", Tag::SurfacePoints},
-        {Tag::Alignments, "Alignment", Tag::Alignment},
-        {Tag::Alignment, "StaEquation", Tag::Equation},
-        {Tag::Alignment, "CoordGeom", Tag::Geometry},
-        {Tag::Alignment, "Profile", Tag::Profile},
-        {Tag::Alignment, "CrossSects", Tag::Sections},
-        {Tag::Geometry, "Line", Tag::Line},
-        {Tag::Geometry, "IrregularLine", Tag::IrregularLine},
-        {Tag::Geometry, "Curve", Tag::Curve},
-        {Tag::Geometry, "Spiral", Tag::Spiral},
-        {Tag::Profile, "ProfAlign", Tag::GradeLine},
-        {Tag::Profile, "ProfSurf", Tag::SurfaceLine},
-        {Tag::GradeLine, "PVI", Tag::GradePoint},
-        {Tag::GradeLine, "ParaCurve", Tag::Parabola},
-        {Tag::GradeLine, "UnsymParaCurve", Tag::UnsymmetricParabola},
-        {Tag::GradeLine, "CircCurve", Tag::Circle},
-        {Tag::SurfaceLine, "PntList2D", Tag::PointList2},
-        {Tag::Sections, "CrossSect", Tag::Section},
-        {Tag::Section, "CrossSectSurf", Tag::SectionSurface},
-        {Tag::Section, "DesignCrossSectSurf", Tag::DesignSectionSurface},
-        {Tag::SectionSurface, "PntList2D", Tag::PointList2},
-        {Tag::DesignSectionSurface, "CrossSectPnt", Tag::SectionPoint},
-        {Tag::Parcels, "Parcel", Tag::Parcel},
-        {Tag::Parcel, "Center", Tag::Centre},
-        {Tag::Parcel, "CoordGeom", Tag::Geometry},
-        {Tag::Parcel, "Parcels", Tag::Parcels},
-        {Tag::IrregularLine, "PntList2D", Tag::PointList2},
-        {Tag::IrregularLine, "PntList3D", Tag::PointList3},
-    };
-    for (const Row &row : rows) {
-        if (row.parent == parent && row.name == name) {
-            return row.tag;
-        }
-    }
-    if (parent >= Tag::Line && parent <= Tag::Spiral) {
-        return name == "Start"    ? Tag::Start
-               : name == "End"    ? Tag::End
-               : name == "Center" ? Tag::Centre
-               : name == "PI"     ? Tag::Intersection
-                                  : Tag::None;
-    }
-    return Tag::None;
-}
-
-/// What says who made a file and where, which is not data.
-bool LandXmlReader::isHeader(std::string_view name)
-{
-    return name == "Units" || name == "Project" || name == "Application" || name == "CoordinateSystem";
 }
 
 XmlHandler::Interest LandXmlReader::startElement(std::string_view name, const XmlAttributes &attributes)
@@ -95,6 +31,9 @@ XmlHandler::Interest LandXmlReader::startElement(std::string_view name, const Xm
     if (open_.empty()) {
         open_.push_back({Tag::Root, false});
         return Interest::Parts;
+    }
+    if (open_.back().isRead) {
+        text_ += ' '; // an element parts the numbers around it
     }
     const Tag tag = tagOf(open_.back().tag, name);
     if (tag == Tag::None) {
@@ -143,7 +82,20 @@ void LandXmlReader::text(std::string_view piece)
 
 void LandXmlReader::foreignElement(std::string_view name)
 {
+    if (!open_.empty() && open_.back().isRead) {
+        text_ += ' ';
+    }
     notes_.passOver(name);
+}
+
+/// Counts what is kept, by the bytes that it takes in a file at the least. What is kept takes far more memory than an empty
+/// element takes in a file, so that elements without content would fill the memory.
+void LandXmlReader::weigh(std::size_t bytes)
+{
+    weight_ += bytes;
+    if (weight_ > mostWeight_) {
+        stream_.fail(stream_.currentByte(), Xlate("the file has too many elements without content"));
+    }
 }
 
 XmlHandler::Interest LandXmlReader::begin(Tag tag, const XmlAttributes &attributes)
@@ -187,7 +139,12 @@ XmlHandler::Interest LandXmlReader::beginInAlignment(Tag tag, const XmlAttribute
     case Tag::Start:
     case Tag::End:
     case Tag::Centre:
-    case Tag::Intersection: startCoordinates(coordinatesOf(tag), attributes); return Interest::Text;
+    case Tag::Intersection: {
+        LandXmlCoordinates &at = coordinatesOf(tag);
+        startCoordinates(at, attributes);
+        at.name = attributes.text("name");
+        return Interest::Text;
+    }
     case Tag::PointList2:
     case Tag::PointList3: return isListRead() ? Interest::Text : Interest::Parts;
     default: return Interest::Parts;
@@ -208,10 +165,12 @@ XmlHandler::Interest LandXmlReader::beginInProfile(Tag tag, const XmlAttributes 
 {
     LandXmlAlignment &alignment = alignments.back();
     if (tag == Tag::GradeLine) {
+        weigh(leastElement);
         LandXmlGradeLine &line = alignment.gradeLines.emplace_back();
         line.name = textOf(attributes, "name");
         line.byte = stream_.currentByte();
     } else if (tag == Tag::SurfaceLine && wants_.surfaceLines) {
+        weigh(leastElement);
         LandXmlHeightLine &line = alignment.surfaceLines.emplace_back();
         line.name = textOf(attributes, "name");
         line.byte = stream_.currentByte();

@@ -12,7 +12,7 @@
 namespace kareport
 {
 
-/// What is wanted of a file. What is not is walked past and takes neither time nor memory.
+/// What is wanted of a file. Anything else takes no memory, and next to no time.
 struct LandXmlWants
 {
     bool points = false;
@@ -37,7 +37,7 @@ public:
     const std::optional<InputError> &error() const { return stream_.error(); }
     std::size_t position() const { return stream_.position(); }
 
-    /// Of the points that were read since they were dropped, as they stand in the file, the number and each.
+    /// The number of points that were read since they were dropped, and each of them in the order of the file.
     std::size_t pointCount() const { return pointCount_; }
     const LandXmlPoint &point(std::size_t index) const { return points_[index]; }
     void dropPoints() { pointCount_ = 0; }
@@ -84,13 +84,21 @@ private:
     LandXmlCoordinates &coordinatesOf(Tag tag);
     LandXmlElement &element();
 
-    double number(const XmlAttributes &attributes, const char *name, double missing = notGiven);
-    double length(const XmlAttributes &attributes, const char *name)
+    double number(const XmlAttributes &attributes, const char *name, double unit, bool mayBeInfinite = false);
+    double length(const XmlAttributes &attributes, const char *name) { return number(attributes, name, units_.metres); }
+    double area(const XmlAttributes &attributes, const char *name)
     {
-        return number(attributes, name) * units_.metres;
+        return number(attributes, name, units_.squareMetres);
+    }
+    /// A radius; that of a line may be infinite.
+    double radius(const XmlAttributes &attributes, const char *name)
+    {
+        return number(attributes, name, units_.metres, true);
     }
     double angle(const XmlAttributes &attributes, const char *name, LandXmlAngle form);
+    double direction(const XmlAttributes &attributes, const char *name);
     void startCoordinates(LandXmlCoordinates &at, const XmlAttributes &attributes);
+    void weigh(std::size_t bytes);
     void takeCoordinates(LandXmlCoordinates &at);
     bool takeNumbers();
     void takePair(double &first, double &second);
@@ -98,6 +106,8 @@ private:
     /// A text of the file for a message, cut short.
     static QString quoteOf(std::string_view text);
 
+    std::size_t mostWeight_; ///< of what is kept
+    std::size_t weight_ = 0;
     XmlStream stream_;
     LandXmlUnits units_;
     LandXmlWants wants_;

@@ -11,10 +11,12 @@ namespace kareport
 
 void LandXmlReader::beginAlignment(const XmlAttributes &attributes)
 {
+    weigh(leastElement);
     LandXmlAlignment &alignment = alignments.emplace_back();
     alignment.name = textOf(attributes, "name");
     alignment.description = textOf(attributes, "desc");
-    alignment.staStart = number(attributes, "staStart", 0) * units_.metres;
+    const double start = length(attributes, "staStart");
+    alignment.staStart = std::isnan(start) ? 0 : start;
     alignment.length = length(attributes, "length");
     alignment.byte = stream_.currentByte();
 }
@@ -33,12 +35,13 @@ void LandXmlReader::beginPoint(Tag tag, const XmlAttributes &attributes)
     startCoordinates(point.at, attributes);
 }
 
+/// Begins coordinates, without the name that they may have.
+
 void LandXmlReader::startCoordinates(LandXmlCoordinates &at, const XmlAttributes &attributes)
 {
     at.position.reset();
     at.height = notGiven;
     at.reference = attributes.text("pntRef");
-    at.name = attributes.text("name");
     at.byte = stream_.currentByte();
 }
 
@@ -62,6 +65,7 @@ LandXmlCoordinates &LandXmlReader::coordinatesOf(Tag tag)
 
 void LandXmlReader::beginElement(Tag tag, const XmlAttributes &attributes)
 {
+    weigh(leastElement);
     auto &elements = parcelPath_.empty() ? alignments.back().elements : parcels[parcelPath_.back()].elements;
     LandXmlElement &element = elements.emplace_back();
     element.byte = stream_.currentByte();
@@ -73,21 +77,22 @@ void LandXmlReader::beginElement(Tag tag, const XmlAttributes &attributes)
     element.form = textOf(attributes, "spiType");
     element.rotation = textOf(attributes, "rot");
     element.length = length(attributes, "length");
-    element.radius = length(attributes, "radius");
-    element.radiusStart = length(attributes, "radiusStart");
-    element.radiusEnd = length(attributes, "radiusEnd");
+    element.radius = radius(attributes, "radius");
+    element.radiusStart = radius(attributes, "radiusStart");
+    element.radiusEnd = radius(attributes, "radiusEnd");
     element.staStart = length(attributes, "staStart");
-    element.direction = angle(attributes, tag == Tag::Line ? "dir" : "dirStart", units_.direction);
-    element.directionEnd = angle(attributes, "dirEnd", units_.direction);
+    element.direction = direction(attributes, tag == Tag::Line ? "dir" : "dirStart");
+    element.directionEnd = direction(attributes, "dirEnd");
     element.delta = angle(attributes, "delta", units_.angle);
 }
 
-/// Keeps an element of a kind that has no geometry here: what comes after it stands farther along.
+/// Keeps an element of a kind that has no geometry here: those after it are farther along the alignment.
 void LandXmlReader::beginOther(std::string_view name)
 {
     if (!isGeometryWanted()) {
         return;
     }
+    weigh(leastElement);
     auto &elements = parcelPath_.empty() ? alignments.back().elements : parcels[parcelPath_.back()].elements;
     LandXmlElement &element = elements.emplace_back();
     element.byte = stream_.currentByte();
@@ -116,17 +121,18 @@ void LandXmlReader::beginGradePoint(Tag tag, const XmlAttributes &attributes)
     point.length = length(attributes, "length");
     point.lengthIn = length(attributes, "lengthIn");
     point.lengthOut = length(attributes, "lengthOut");
-    point.radius = length(attributes, "radius");
+    point.radius = radius(attributes, "radius");
     point.byte = stream_.currentByte();
 }
 
 void LandXmlReader::beginSection(const XmlAttributes &attributes)
 {
+    weigh(leastElement);
     LandXmlSection &section = alignments.back().sections.emplace_back();
     section.name = textOf(attributes, "name");
     section.station = length(attributes, "sta");
-    section.cutArea = number(attributes, "areaCut") * units_.squareMetres;
-    section.fillArea = number(attributes, "areaFill") * units_.squareMetres;
+    section.cutArea = area(attributes, "areaCut");
+    section.fillArea = area(attributes, "areaFill");
     const double skew = angle(attributes, "angleSkew", units_.angle);
     section.byte = stream_.currentByte();
     if (std::fabs(skew) > 0) {
@@ -141,6 +147,7 @@ void LandXmlReader::beginSection(const XmlAttributes &attributes)
 
 void LandXmlReader::beginSectionSurface(Tag tag, const XmlAttributes &attributes)
 {
+    weigh(leastElement);
     LandXmlSectionSurface &surface = alignments.back().sections.back().surfaces.emplace_back();
     surface.name = textOf(attributes, "name");
     surface.side = textOf(attributes, "side");
@@ -159,23 +166,44 @@ void LandXmlReader::beginParcel(const XmlAttributes &attributes)
     }
     const std::string owner = parcelPath_.empty() ? std::string() : parcels[parcelPath_.back()].name;
     parcelPath_.push_back(parcels.size());
+    weigh(leastElement);
     LandXmlParcel &parcel = parcels.emplace_back();
     parcel.owner = owner;
     parcel.name = textOf(attributes, "name");
     parcel.description = textOf(attributes, "desc");
-    parcel.area = number(attributes, "area") * units_.squareMetres;
+    parcel.area = area(attributes, "area");
     parcel.byte = stream_.currentByte();
 }
 
-double LandXmlReader::number(const XmlAttributes &attributes, const char *name, double missing)
+/// A number in the file's unit, which is given in ours; not a number where the attribute is missing.
+double LandXmlReader::number(const XmlAttributes &attributes, const char *name, double unit, bool mayBeInfinite)
 {
     const auto value = attributes.find(name);
-    double number = missing;
-    if (value && !value->empty() && (!parseNumber(*value, number) || std::isnan(number))) {
+    if (!value || value->empty()) {
+        return notGiven;
+    }
+    double number = notGiven;
+    const bool isNumber = parseNumber(*value, number) && !std::isnan(number);
+    number *= unit;
+    if (!isNumber || (std::isinf(number) && !mayBeInfinite)) {
         stream_.fail(stream_.currentByte(), Xlate("the attribute %1=\"%2\" does not fit: a number was expected")
                                                 .arg(QString::fromUtf8(name), quoteOf(*value)));
     }
     return number;
+}
+
+/// A direction, which is only compared with the geometry: one that cannot be read is noted.
+double LandXmlReader::direction(const XmlAttributes &attributes, const char *name)
+{
+    const auto value = attributes.find(name);
+    double radians = notGiven;
+    if (value && !value->empty() && !parseLandXmlAngle(*value, units_.direction, radians)) {
+        notes_.add(stream_.currentByte(), Xlate("the attribute %1=\"%2\" does not fit: an angle in the file's unit was "
+                                                "expected")
+                                              .arg(QString::fromUtf8(name), quoteOf(*value)));
+        return notGiven;
+    }
+    return radians;
 }
 
 double LandXmlReader::angle(const XmlAttributes &attributes, const char *name, LandXmlAngle form)

@@ -68,7 +68,7 @@ void LandXmlReader::addPoint()
     std::swap(points_[pointCount_++], point_); // the texts' memory is used again
 }
 
-/// Reads the text as numbers with blanks between them. A sign that a line end has parted from its number belongs to it.
+/// Reads the text as numbers with blanks between them. A sign that a line end separates from its number belongs to it.
 bool LandXmlReader::takeNumbers()
 {
     numbers_.clear();
@@ -95,7 +95,7 @@ bool LandXmlReader::takeNumbers()
         }
         double number = 0;
         const auto result = std::from_chars(at, end, number);
-        const bool isNumber = result.ec == std::errc() && std::isfinite(number) &&
+        const bool isNumber = result.ec == std::errc() && std::isfinite(number * units_.metres) &&
                               (result.ptr == end || isBlank(*result.ptr)) && *at != '-';
         if (!isNumber) {
             const char *last = at;
@@ -110,7 +110,7 @@ bool LandXmlReader::takeNumbers()
         at = result.ptr;
     }
     if (isSignApart) {
-        notes_.add(textByte_, Xlate("signs stand apart from their numbers, to which they were taken to belong"));
+        notes_.add(textByte_, Xlate("signs are separated from their numbers by blanks, and were taken with them"));
     }
     return true;
 }
@@ -155,9 +155,15 @@ void LandXmlReader::endPointList(Tag tag)
     }
     const std::size_t each = tag == Tag::PointList2 ? 2 : 3;
     if (numbers_.size() % each != 0) {
-        notes_.add(textByte_, Xlate("the list of numbers ends within a point, which is passed over"));
+        notes_.add(textByte_, Xlate("the list of numbers ends in the middle of a point, which was left out"));
     }
     const Tag owner = open_.back().tag;
+    if (owner == Tag::SurfaceLine) {
+        LandXmlHeightLine &line = alignments.back().surfaceLines.back();
+        line.pieces.push_back(line.points.size());
+    } else if (owner == Tag::IrregularLine) {
+        weigh(leastPoint * (numbers_.size() / each));
+    }
     for (std::size_t i = 0; i + each <= numbers_.size(); i += each) {
         const double first = numbers_[i] * units_.metres;
         const double second = numbers_[i + 1] * units_.metres;
@@ -166,10 +172,7 @@ void LandXmlReader::endPointList(Tag tag)
         } else if (owner == Tag::SectionSurface) {
             alignments.back().sections.back().surfaces.back().points.push_back({first, second, {}});
         } else {
-            LandXmlCoordinates &at = element().between.emplace_back();
-            at.position = PlanePoint{first, second};
-            at.height = each == 3 ? numbers_[i + 2] * units_.metres : notGiven;
-            at.byte = textByte_;
+            element().between.push_back({first, second});
         }
     }
 }

@@ -11,59 +11,86 @@ namespace kareport
 namespace
 {
 
+/// Counts the pieces of the curves of a file. A small file can hold curves that would take minutes to make.
+class PieceBudget
+{
+public:
+    explicit PieceBudget(std::size_t elements) : left_(500000 + 16 * elements) {}
+
+    bool isSpent() const { return isSpent_; }
+    void take(std::size_t pieces)
+    {
+        isSpent_ = isSpent_ || pieces > left_;
+        left_ -= std::min(pieces, left_);
+    }
+
+private:
+    std::size_t left_;
+    bool isSpent_ = false;
+};
+
 /// Makes the geometry of one alignment.
 class RouteMaker
 {
 public:
-    RouteMaker(const LandXmlAlignment &stored, const LandXmlGeometry &geometry, LandXmlNotes &notes)
-        : stored_(stored), geometry_(geometry), notes_(notes)
+    RouteMaker(const LandXmlAlignment &stored, LandXmlComparison &comparison, LandXmlNotes &notes)
+        : stored_(stored), comparison_(comparison), notes_(notes)
     {
         route_.stored = &stored;
         route_.stationing = Stationing(stored.staStart);
     }
 
-    /// @param budget  pieces of curves that may still be made
-    LandXmlRoute make(std::size_t &budget)
+    LandXmlRoute make(PieceBudget &budget)
     {
-        for (std::size_t i = 0; i < stored_.elements.size(); ++i) {
+        if (budget.isSpent()) {
+            route_.stationFault = LandXmlFault{windsTooOften(), stored_.byte};
+        }
+        for (std::size_t i = 0; i < stored_.elements.size() && !budget.isSpent(); ++i) {
             addElement(i, budget);
         }
+        if (route_.stationFault) {
+            return std::move(route_);
+        }
         if (route_.isLengthKnown) {
-            geometry_.compareLength(stored_.byte, "length", stored_.length, route_.length);
+            comparison_.length(stored_.byte, "length", stored_.length, route_.length);
         }
         addEquations();
         for (const LandXmlGradeLine &line : stored_.gradeLines) {
-            route_.profiles.push_back(geometry_.profileOf(line));
+            route_.profiles.push_back(profileOf(line));
             if (const auto *fault = std::get_if<LandXmlFault>(&route_.profiles.back())) {
                 notes_.add(fault->byte, fault->text);
             }
         }
+        for (const LandXmlHeightLine &line : stored_.surfaceLines) {
+            route_.isSurfaceSound.push_back(checkSurface(line));
+        }
         return std::move(route_);
     }
 
-    /// Whether its places have names; otherwise the fault says why not.
-    bool hasStations() const { return hasStations_; }
-
 private:
-    void addElement(std::size_t index, std::size_t &budget)
+    void addElement(std::size_t index, PieceBudget &budget)
     {
-        if (budget == 0) {
-            return;
-        }
         const LandXmlElement &element = stored_.elements[index];
         LandXmlRoute::Piece piece{index, route_.length, 0, {}};
-        LandXmlCurves made = geometry_.curvesOf(element);
+        const bool isPoint = endsWhereItStarts(element);
+        // One of a fraction of a millimetre has no direction.
+        const bool isTooShort = isPoint && element.length <= comparison_.tolerance().length;
+        LandXmlCurves made = isTooShort ? LandXmlCurves() : curvesOf(element, comparison_);
         double length = 0;
         if (auto *curves = std::get_if<std::vector<PlaneCurve>>(&made)) {
             for (const PlaneCurve &curve : *curves) {
                 length += curve.length();
-                takeBudget(curve.pieces(), element, budget);
+                budget.take(curve.pieces());
             }
             piece.curves = std::move(*curves);
         }
-        piece.length = element.length > 0 && std::isfinite(element.length) ? element.length : length;
-        if (!(piece.length > 0) && isNowhere(element)) {
-            notes_.add(element.byte, Xlate("the element has no length and is passed over"));
+        if (budget.isSpent()) {
+            route_.stationFault = LandXmlFault{windsTooOften(), element.byte};
+            return;
+        }
+        piece.length = element.length > 0 ? element.length : length;
+        if (isTooShort || (isPoint && piece.length == 0)) {
+            notes_.add(element.byte, Xlate("the element has no length and was left out"));
             return;
         }
         if (const auto *fault = std::get_if<LandXmlFault>(&made)) {
@@ -72,7 +99,7 @@ private:
         }
         piece.isPlaced = route_.isLengthKnown;
         if (piece.isPlaced) {
-            geometry_.compareLength(element.byte, "staStart", element.staStart, stored_.staStart + route_.length);
+            comparison_.length(element.byte, "staStart", element.staStart, stored_.staStart + route_.length);
         }
         route_.isLengthKnown = route_.isLengthKnown && piece.length > 0;
         addCurves(piece, length);
@@ -80,25 +107,13 @@ private:
         route_.pieces.push_back(std::move(piece));
     }
 
-    /// A small file can hold curves that would take minutes to make.
-    void takeBudget(std::size_t pieces, const LandXmlElement &element, std::size_t &budget)
-    {
-        if (pieces > budget && !route_.fault) {
-            route_.fault = LandXmlFault{Xlate("the elements wind round too often"), element.byte};
-        }
-        budget -= std::min(pieces, budget);
-    }
+    static QString windsTooOften() { return Xlate("the elements wind round too often"); }
 
-    bool isNowhere(const LandXmlElement &element) const
+    static bool endsWhereItStarts(const LandXmlElement &element)
     {
-        if (!element.start.isGiven() || !element.end.isGiven()) {
-            return false;
-        }
-        const auto start = geometry_.positionOf(element.start);
-        const auto end = geometry_.positionOf(element.end);
-        const auto *from = std::get_if<PlanePoint>(&start);
-        const auto *to = std::get_if<PlanePoint>(&end);
-        return from != nullptr && to != nullptr && distanceBetween(*from, *to) == 0;
+        const auto &start = element.start.position;
+        const auto &end = element.end.position;
+        return start && end && distanceBetween(*start, *end) == 0;
     }
 
     void addCurves(const LandXmlRoute::Piece &piece, double length)
@@ -108,8 +123,8 @@ private:
         }
         if (!route_.alignment.elements().empty()) {
             const PlanePoint before = route_.alignment.elements().back().curve.end().point;
-            const double gap = distanceBetween(before, piece.curves.front().start().point);
-            geometry_.compareLength(stored_.elements[piece.element].byte, "Start", gap, 0);
+            comparison_.gap(stored_.elements[piece.element].byte,
+                            distanceBetween(before, piece.curves.front().start().point));
         }
         for (const PlaneCurve &curve : piece.curves) {
             route_.alignment.add(curve, curve.length() * (piece.length / length));
@@ -127,26 +142,37 @@ private:
                 internal = before + (equation.back - ahead) * direction;
             }
             if (!route_.stationing.add({internal, equation.ahead, equation.isDecreasing})) {
-                route_.fault = LandXmlFault{Xlate("the station equation is not ahead of the start and of the equations "
-                                                  "before it, or has no numbers: staInternal or staBack, and staAhead "
-                                                  "were expected"),
-                                            equation.byte};
-                hasStations_ = false;
+                route_.stationFault = LandXmlFault{
+                    Xlate("the station equation is before the start or not ahead of the equation before it, "
+                          "or has no numbers: staInternal or staBack, and staAhead were expected"),
+                    equation.byte};
                 return;
             }
-            geometry_.compareLength(equation.byte, "staBack", equation.back,
-                                    route_.stationing.nameOf(internal, true).station);
+            comparison_.length(equation.byte, "staBack", equation.back,
+                               route_.stationing.nameOf(internal, true).station);
             before = internal;
             ahead = equation.ahead;
             direction = equation.isDecreasing ? -1 : 1;
         }
     }
 
+    bool checkSurface(const LandXmlHeightLine &line)
+    {
+        const bool isSound =
+            std::is_sorted(line.points.begin(), line.points.end(),
+                           [](const auto &left, const auto &right) { return left.first < right.first; });
+        if (!isSound) {
+            notes_.add(line.byte,
+                       Xlate("the stations of the surface \"%1\" do not ascend: no heights are taken from it")
+                           .arg(QString::fromStdString(line.name)));
+        }
+        return isSound;
+    }
+
     const LandXmlAlignment &stored_;
-    const LandXmlGeometry &geometry_;
+    LandXmlComparison &comparison_;
     LandXmlNotes &notes_;
     LandXmlRoute route_;
-    bool hasStations_ = true;
 };
 
 template <typename Line>
@@ -169,7 +195,7 @@ const VerticalProfile *LandXmlRoute::profile(const std::string &name) const
 const LandXmlHeightLine *LandXmlRoute::surface(const std::string &name) const
 {
     const std::size_t index = indexOf(stored->surfaceLines, name);
-    return index < stored->surfaceLines.size() ? &stored->surfaceLines[index] : nullptr;
+    return index < isSurfaceSound.size() && isSurfaceSound[index] ? &stored->surfaceLines[index] : nullptr;
 }
 
 std::optional<double> heightOn(const LandXmlHeightLine &line, double station)
@@ -178,34 +204,34 @@ std::optional<double> heightOn(const LandXmlHeightLine &line, double station)
     constexpr double rounding = 1e-4; // of the stations of such lists
     const auto next = std::lower_bound(points.begin(), points.end(), station,
                                        [](const auto &point, double at) { return point.first < at; });
-    if (next == points.end()) {
-        const bool isAtEnd = !points.empty() && station <= points.back().first + rounding;
-        return isAtEnd ? std::optional(points.back().second) : std::nullopt;
+    const auto index = static_cast<std::size_t>(next - points.begin());
+    const bool isFirst = std::binary_search(line.pieces.begin(), line.pieces.end(), index);
+    if (next != points.begin() && next != points.end() && !isFirst) {
+        const auto &[from, height] = *(next - 1);
+        return height + (next->second - height) * ((station - from) / (next->first - from));
     }
-    if (next == points.begin()) {
-        return station >= next->first - rounding ? std::optional(next->second) : std::nullopt;
+    if (next != points.end() && next->first - station <= rounding) {
+        return next->second;
     }
-    const auto &[from, height] = *(next - 1);
-    return height + (next->second - height) * ((station - from) / (next->first - from));
+    if (next != points.begin() && station - (next - 1)->first <= rounding) {
+        return (next - 1)->second;
+    }
+    return std::nullopt;
 }
 
-std::variant<std::vector<LandXmlRoute>, LandXmlFault> routesOf(const std::vector<LandXmlAlignment> &alignments,
-                                                               const LandXmlGeometry &geometry, LandXmlNotes &notes)
+std::vector<LandXmlRoute> routesOf(const std::vector<const LandXmlAlignment *> &alignments,
+                                   LandXmlComparison &comparison, LandXmlNotes &notes)
 {
-    std::vector<LandXmlRoute> routes;
     std::size_t elements = 0;
-    for (const LandXmlAlignment &alignment : alignments) {
-        elements += alignment.elements.size();
+    for (const LandXmlAlignment *alignment : alignments) {
+        elements += alignment->elements.size();
     }
-    std::size_t budget = 500000 + 16 * elements;
-    for (const LandXmlAlignment &alignment : alignments) {
-        RouteMaker maker(alignment, geometry, notes);
-        routes.push_back(maker.make(budget));
-        const auto &fault = routes.back().fault;
-        if (fault && (!maker.hasStations() || budget == 0)) {
-            return *fault;
-        }
+    PieceBudget budget(elements);
+    std::vector<LandXmlRoute> routes;
+    for (const LandXmlAlignment *alignment : alignments) {
+        routes.push_back(RouteMaker(*alignment, comparison, notes).make(budget));
     }
+    comparison.noteDirections();
     return routes;
 }
 

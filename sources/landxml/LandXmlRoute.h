@@ -1,6 +1,8 @@
 #pragma once
 
-#include "LandXmlGeometry.h"
+#include "Alignment.h"
+#include "LandXmlProfile.h"
+#include "Stationing.h"
 
 #include <optional>
 #include <variant>
@@ -17,7 +19,7 @@ struct LandXmlRoute
     {
         std::size_t element;            ///< index among the stored ones
         double start;                   ///< distance from the alignment's start
-        double length;                  ///< 0 where nothing says it
+        double length;                  ///< 0 where it is not known
         std::vector<PlaneCurve> curves; ///< none where it has no geometry
         bool isPlaced = true;           ///< `start` is known: the length of each element before it is
     };
@@ -29,7 +31,9 @@ struct LandXmlRoute
     bool isLengthKnown = true; ///< not where an element has neither a geometry nor a stated length
     Stationing stationing{0};
     std::vector<std::variant<LandXmlProfile, LandXmlFault>> profiles; ///< of the grade lines, in their order
-    std::optional<LandXmlFault> fault;                                ///< why there is no place along the whole of it
+    std::optional<LandXmlFault> fault;                                ///< why places along it are not known
+    std::optional<LandXmlFault> stationFault;                         ///< why places along it have no stations
+    std::vector<bool> isSurfaceSound;                                 ///< of the stored surfaces: their stations ascend
 
     /// The station of a distance. @param back  the name that a place on an equation has before it
     Stationing::Name nameOf(double distance, bool back = false) const
@@ -38,16 +42,17 @@ struct LandXmlRoute
     }
     /// The grade line of a name, or the first where it is empty; null when there is none, or it has no geometry.
     const VerticalProfile *profile(const std::string &name) const;
-    /// The surface of a name along the alignment, or the first.
+    /// The surface of a name along the alignment, or the first where it is empty; null when there is none, or its stations do
+    /// not ascend.
     const LandXmlHeightLine *surface(const std::string &name) const;
 };
 
-/// The height on a line at a station, between its points; nothing outside.
+/// The height on a line at a station, between two points of a piece; nothing outside, and in the gap between two pieces.
 std::optional<double> heightOn(const LandXmlHeightLine &line, double station);
 
-/// Makes the geometry of alignments, and says in the notes what does not fit together. @return one for each, or why
-/// their geometry cannot be had. They refer to the alignments, which must live as long.
-std::variant<std::vector<LandXmlRoute>, LandXmlFault> routesOf(const std::vector<LandXmlAlignment> &alignments,
-                                                               const LandXmlGeometry &geometry, LandXmlNotes &notes);
+/// Makes the geometry of alignments whose references are resolved, and notes what does not fit together. @return one for
+/// each. They refer to the alignments, which must live as long
+std::vector<LandXmlRoute> routesOf(const std::vector<const LandXmlAlignment *> &alignments,
+                                   LandXmlComparison &comparison, LandXmlNotes &notes);
 
 } // namespace kareport

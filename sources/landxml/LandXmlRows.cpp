@@ -1,14 +1,19 @@
 #include "LandXmlRows.h"
 
 #include "AlignmentRows.h"
+#include "ElementRows.h"
+#include "LandXmlReferences.h"
 #include "ParcelRows.h"
 #include "PointRows.h"
+#include "ProfileRows.h"
+#include "ProjectedRows.h"
 #include "SectionRows.h"
 #include "StationRows.h"
 #include "Xlate.h"
 
 #include <QStringList>
 
+#include <algorithm>
 #include <array>
 #include <utility>
 
@@ -20,30 +25,36 @@ namespace
 
 using Kind = LandXmlListKind;
 
-constexpr std::array<std::pair<QStringView, Kind>, 10> keys = {{{u"points", Kind::Points},
-                                                                {u"surfacePoints", Kind::SurfacePoints},
-                                                                {u"parcels", Kind::Parcels},
-                                                                {u"courses", Kind::Courses},
-                                                                {u"alignments", Kind::Alignments},
-                                                                {u"elements", Kind::Elements},
-                                                                {u"stations", Kind::Stations},
-                                                                {u"profile", Kind::Profile},
-                                                                {u"crossSections", Kind::CrossSections},
-                                                                {u"offsetsOf", Kind::OffsetsOf}}};
-
-} // namespace
-
-bool hasReferences(const std::vector<LandXmlElement> &elements)
+struct ListKey
 {
-    for (const LandXmlElement &element : elements) {
-        for (const auto *at : {&element.start, &element.end, &element.centre, &element.intersection}) {
-            if (!at->reference.empty() && !at->position) {
-                return true;
-            }
+    QStringView key;
+    Kind kind;
+};
+
+constexpr std::array<ListKey, 10> keys = {{{u"points", Kind::Points},
+                                           {u"surfacePoints", Kind::SurfacePoints},
+                                           {u"parcels", Kind::Parcels},
+                                           {u"courses", Kind::Courses},
+                                           {u"alignments", Kind::Alignments},
+                                           {u"elements", Kind::Elements},
+                                           {u"stations", Kind::Stations},
+                                           {u"profile", Kind::Profile},
+                                           {u"crossSections", Kind::CrossSections},
+                                           {u"offsetsOf", Kind::OffsetsOf}}};
+
+/// Whether the row of each kind is at its own number, so that a key is found by it.
+constexpr bool areInOrder()
+{
+    for (std::size_t i = 0; i < keys.size(); ++i) {
+        if (static_cast<std::size_t>(keys[i].kind) != i) {
+            return false;
         }
     }
-    return false;
+    return static_cast<std::size_t>(Kind::OffsetsOf) + 1 == keys.size();
 }
+static_assert(areInOrder());
+
+} // namespace
 
 std::optional<LandXmlListKind> landXmlListFromKey(QStringView key)
 {
@@ -57,7 +68,7 @@ std::optional<LandXmlListKind> landXmlListFromKey(QStringView key)
 
 QStringView keyOf(LandXmlListKind kind)
 {
-    return keys[static_cast<std::size_t>(kind)].first;
+    return keys[static_cast<std::size_t>(kind)].key;
 }
 
 std::unique_ptr<LandXmlRows> LandXmlRows::make(LandXmlSource source)
@@ -89,7 +100,7 @@ LandXmlRows::LandXmlRows(LandXmlSource source)
     const QStringList known = {QString(), QStringLiteral("1.0"), QStringLiteral("1.1"), QStringLiteral("1.2"),
                                QStringLiteral("2.0")};
     if (!known.contains(version)) {
-        modelNotes_.add(0, Xlate("the file is of version %1: what is read are versions 1.0 to 2.0").arg(version));
+        modelNotes_.add(0, Xlate("the file is of version %1: versions 1.0 to 2.0 are known").arg(version));
     }
     if (const QString &unit = source_.header.otherElevationUnit; !unit.isEmpty()) {
         modelNotes_.add(source_.header.unitsByte,
@@ -108,7 +119,7 @@ const LandXmlPointTable *LandXmlRows::pointTable()
 {
     if (!pointTable_) {
         auto table = std::make_unique<LandXmlPointTable>();
-        LandXmlNotes unheard(source_.file); // what is odd is said by the pass that makes the rows
+        LandXmlNotes unheard(source_.file); // the pass that makes the rows has them, too
         LandXmlWants wants;
         wants.points = true;
         LandXmlReader reader(source_.file, source_.header.units, wants, unheard);
@@ -118,6 +129,10 @@ const LandXmlPointTable *LandXmlRows::pointTable()
                 table->add(reader.point(i));
             }
             reader.dropPoints();
+            if (isMore && source_.progress && !source_.progress(reader.position())) {
+                isStopped_ = true;
+                return nullptr;
+            }
         }
         if (reader.error()) {
             error_ = reader.error();
@@ -151,22 +166,46 @@ bool LandXmlRows::readAlignments(AlignmentModel &model, LandXmlWants wants)
         return false;
     }
     model.alignments = std::move(reader->alignments);
-    bool refers = false;
-    for (const LandXmlAlignment &alignment : model.alignments) {
-        refers = refers || hasReferences(alignment.elements);
-    }
+    return true;
+}
+
+bool LandXmlRows::makeRoutes(AlignmentModel &model, const std::vector<LandXmlAlignment *> &alignments)
+{
+    const bool refers = std::any_of(alignments.begin(), alignments.end(), [](const LandXmlAlignment *alignment) {
+        return hasReferences(alignment->elements);
+    });
     const LandXmlPointTable *points = refers ? pointTable() : nullptr;
     if (refers && points == nullptr) {
         return false;
     }
-    const LandXmlGeometry geometry(source_.header.units, source_.query.tolerance, points, &modelNotes_);
-    auto routes = routesOf(model.alignments, geometry, modelNotes_);
-    if (const auto *fault = std::get_if<LandXmlFault>(&routes)) {
-        fail(*fault);
+    for (LandXmlAlignment *alignment : alignments) {
+        if (points != nullptr) {
+            resolve(alignment->elements, *points, modelNotes_);
+        }
+    }
+    LandXmlComparison comparison(source_.header.units, source_.query.tolerance, modelNotes_);
+    model.routes = routesOf({alignments.begin(), alignments.end()}, comparison, modelNotes_);
+    for (const LandXmlRoute &route : model.routes) {
+        if (route.stationFault) {
+            fail(*route.stationFault);
+            return false;
+        }
+    }
+    return true;
+}
+
+bool LandXmlRows::readNamedAlignments(AlignmentModel &model, const LandXmlWants &wants)
+{
+    if (!readAlignments(model, wants)) {
         return false;
     }
-    model.routes = std::move(std::get<std::vector<LandXmlRoute>>(routes));
-    return true;
+    std::vector<LandXmlAlignment *> named;
+    for (LandXmlAlignment &alignment : model.alignments) {
+        if (isNamed(alignment.name)) {
+            named.push_back(&alignment);
+        }
+    }
+    return makeRoutes(model, named);
 }
 
 bool LandXmlRows::expectNames()

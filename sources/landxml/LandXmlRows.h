@@ -2,57 +2,23 @@
 
 #include "LandXmlNames.h"
 #include "LandXmlNotes.h"
+#include "LandXmlPointTable.h"
 #include "LandXmlQuery.h"
 #include "LandXmlReader.h"
 #include "LandXmlRoute.h"
 #include "LandXmlUnits.h"
+#include "LandXmlValue.h"
 #include "RowList.h"
 
 #include <QString>
 
-#include <cmath>
 #include <memory>
 #include <optional>
 #include <string>
-#include <string_view>
-#include <variant>
 #include <vector>
 
 namespace kareport
 {
-
-/// A value of a row: none, a number in metres, square metres or radians, or a text in UTF-8.
-using LandXmlValue = std::variant<std::monostate, double, std::string_view>;
-
-/// A number that may be missing.
-inline LandXmlValue valueOf(double number)
-{
-    return std::isnan(number) ? LandXmlValue() : LandXmlValue(number);
-}
-inline LandXmlValue valueOf(const std::optional<double> &number)
-{
-    return number ? LandXmlValue(*number) : LandXmlValue();
-}
-inline LandXmlValue valueOf(const std::string &text)
-{
-    return text.empty() ? LandXmlValue() : LandXmlValue(std::string_view(text));
-}
-
-/// A variable that rows have.
-struct LandXmlVariable
-{
-    QString name;
-    int type; ///< the value type that suits it
-};
-
-/// A variable of rows of one class, and how it is had.
-template <typename Rows>
-struct LandXmlGetter
-{
-    const char *name;
-    int type;
-    LandXmlValue (*get)(const Rows &rows);
-};
 
 /// What rows are made from.
 struct LandXmlSource
@@ -65,14 +31,11 @@ struct LandXmlSource
     double unit = 1; ///< metres in the unit of lengths that the query was asked in, for messages
 };
 
-/// Whether coordinates of elements refer to points.
-bool hasReferences(const std::vector<LandXmlElement> &elements);
-
-/// The alignments of a file with their geometry.
+/// The alignments of a file, and the geometry of those that are wanted.
 struct AlignmentModel
 {
     std::vector<LandXmlAlignment> alignments;
-    std::vector<LandXmlRoute> routes; ///< one for each
+    std::vector<LandXmlRoute> routes;
 };
 
 /// Rows of a file, made one at a time.
@@ -115,11 +78,15 @@ protected:
     const LandXmlPointTable *pointTable();
     /// Reads the whole file. @return what was read, or null when something is wrong or the progress has stopped it
     std::unique_ptr<LandXmlReader> readAll(const LandXmlWants &wants);
-    /// Reads the alignments, and makes their geometry. @return whether that went well
+    /// Reads the alignments, without their geometry. @return whether that went well
     bool readAlignments(AlignmentModel &model, LandXmlWants wants);
+    /// Makes the geometry of alignments of the model: what is wrong with others does not count. @return whether that went well
+    bool makeRoutes(AlignmentModel &model, const std::vector<LandXmlAlignment *> &alignments);
+    /// Reads the alignments, and makes the geometry of those that the query asks for. @return whether that went well
+    bool readNamedAlignments(AlignmentModel &model, const LandXmlWants &wants = {});
     /// Whether the query asks for something of a name, or for all.
     bool isNamed(const std::string &name) { return names_.matches(name); }
-    /// Fails where names that the query asks for are not among those that were looked at. @return whether they are
+    /// Fails where a name that the query asks for has not been met. @return whether all were
     bool expectNames();
 
     LandXmlSource source_;

@@ -5,12 +5,17 @@
 namespace kareport
 {
 
-/// What an element is, by its name and what it is in. Those of an alignment stand together, and in it those of a profile
-/// and of cross sections.
+/// Bytes that elements take in a file at the least, and points in a list of numbers.
+inline constexpr std::size_t leastElement = 40;
+inline constexpr std::size_t leastPoint = 12;
+
+/// What an element is, by its name and what it is in. Those of an alignment follow each other, and among them those of a
+/// profile and those of cross sections: the reader compares their order.
 enum class LandXmlReader::Tag : unsigned char
 {
     None, ///< nothing that is read
     Root,
+    Survey,
     Points,
     Point,
     Surfaces,

@@ -28,20 +28,22 @@ struct LandXmlUnits
     LandXmlAngle direction = LandXmlAngle::Radians;
 };
 
-/// What stands before a file's data.
+/// What is before the data of a file.
 struct LandXmlHeader
 {
-    QString version; ///< empty where the file says none
+    QString version; ///< empty where the file states none
     LandXmlUnits units;
-    std::size_t unitsByte = 0;  ///< where they stand
+    std::size_t unitsByte = 0;  ///< their place
     QString otherElevationUnit; ///< that the file states; empty where it is that of its lengths
 };
 
-/// Reads a file up to its units. A file without them, or with a unit that is not known, is wrong: nobody could say what its
-/// numbers are.
+/// Reads a file up to its units. A file without them, or with a unit that is not known, is wrong: its numbers would have no
+/// meaning.
 Expected<LandXmlHeader> readLandXmlHeader(const std::shared_ptr<const FileBytes> &file);
 
 /// An angle of a file, in radians. @return whether the text is one
 bool parseLandXmlAngle(std::string_view text, LandXmlAngle form, double &radians);
+/// An angle as a file writes it, for messages: to a tenth of the tolerance that directions have.
+QString landXmlAngleText(double radians, LandXmlAngle form);
 
 } // namespace kareport

@@ -46,15 +46,4 @@ private:
     std::size_t index_ = beforeFirst;
 };
 
-/// The variables of rows by their getters.
-template <typename Rows, std::size_t count>
-std::vector<LandXmlVariable> variablesOf(const LandXmlGetter<Rows> (&getters)[count])
-{
-    std::vector<LandXmlVariable> variables;
-    for (const LandXmlGetter<Rows> &getter : getters) {
-        variables.push_back({QString::fromLatin1(getter.name), getter.type});
-    }
-    return variables;
-}
-
 } // namespace kareport

@@ -1,23 +1,13 @@
 #include "ParcelRows.h"
 
-#include "CurveFit.h"
+#include "LandXmlReferences.h"
 #include "VariableType.h"
 #include "Xlate.h"
 
-#include <limits>
+#include <algorithm>
 
 namespace kareport
 {
-
-namespace
-{
-
-LandXmlValue count(std::size_t number)
-{
-    return static_cast<double>(number);
-}
-
-} // namespace
 
 bool BorderRows::readParcels()
 {
@@ -28,33 +18,54 @@ bool BorderRows::readParcels()
         return false;
     }
     parcels_ = std::move(reader->parcels);
-    bool refers = false;
-    for (const LandXmlParcel &parcel : parcels_) {
-        refers = refers || hasReferences(parcel.elements);
-    }
-    const LandXmlPointTable *points = refers ? pointTable() : nullptr;
-    if (refers && points == nullptr) {
-        return false;
-    }
-    const LandXmlGeometry geometry(source_.header.units, source_.query.tolerance, points, &modelNotes_);
-    for (const LandXmlParcel &parcel : parcels_) {
+    std::vector<LandXmlParcel *> named;
+    for (LandXmlParcel &parcel : parcels_) {
         if (isNamed(parcel.name)) {
-            borders_.push_back(borderOf(parcel, geometry));
-            if (error_) {
-                return false;
-            }
+            named.push_back(&parcel);
         }
     }
+    if (!resolveReferences(named)) {
+        return false;
+    }
+    LandXmlComparison comparison(source_.header.units, source_.query.tolerance, modelNotes_);
+    for (const LandXmlParcel *parcel : named) {
+        borders_.push_back(borderOf(*parcel, comparison));
+        if (error_) {
+            return false;
+        }
+    }
+    comparison.noteDirections();
     return expectNames();
 }
 
-ParcelBorder BorderRows::borderOf(const LandXmlParcel &parcel, const LandXmlGeometry &geometry)
+bool BorderRows::resolveReferences(const std::vector<LandXmlParcel *> &parcels)
+{
+    const bool refers = std::any_of(parcels.begin(), parcels.end(), [](const LandXmlParcel *parcel) {
+        return isReference(parcel->centre) || hasReferences(parcel->elements);
+    });
+    const LandXmlPointTable *points = refers ? pointTable() : nullptr;
+    if (points == nullptr) {
+        return !refers;
+    }
+    for (LandXmlParcel *parcel : parcels) {
+        resolve(parcel->elements, *points, modelNotes_);
+        resolve(parcel->centre, *points, modelNotes_);
+        if (isReference(parcel->centre)) {
+            modelNotes_.add(
+                parcel->centre.byte,
+                Xlate("the point \"%1\" is not in the file").arg(QString::fromStdString(parcel->centre.reference)));
+        }
+    }
+    return true;
+}
+
+ParcelBorder BorderRows::borderOf(const LandXmlParcel &parcel, LandXmlComparison &comparison)
 {
     ParcelBorder border;
     border.stored = &parcel;
     bool isWhole = !parcel.elements.empty();
     for (std::size_t i = 0; i < parcel.elements.size(); ++i) {
-        const LandXmlCurves made = geometry.curvesOf(parcel.elements[i]);
+        const LandXmlCurves made = curvesOf(parcel.elements[i], comparison);
         if (const auto *fault = std::get_if<LandXmlFault>(&made)) {
             modelNotes_.add(fault->byte, fault->text);
             isWhole = false;
@@ -72,14 +83,8 @@ ParcelBorder BorderRows::borderOf(const LandXmlParcel &parcel, const LandXmlGeom
         }
     }
     measure(border, isWhole && !border.courses.empty());
-    // One part in a thousand, or a tenth of a square metre: areas are stated with few digits.
-    const double stated = parcel.area;
-    if (border.area && std::fabs(stated - *border.area) > std::max(0.1, 0.001 * stated)) {
-        modelNotes_.add(parcel.byte,
-                        Xlate("%1 is %2 in the file, but %3 by its geometry")
-                            .arg(QStringLiteral("area"),
-                                 QString::number(stated / source_.header.units.squareMetres, 'f', 4),
-                                 QString::number(*border.area / source_.header.units.squareMetres, 'f', 4)));
+    if (border.area) {
+        comparison.area(parcel.byte, "area", parcel.area, *border.area);
     }
     return border;
 }
@@ -103,12 +108,12 @@ void BorderRows::measure(ParcelBorder &border, bool isWhole)
         before = to;
     }
     border.perimeter = perimeter;
-    // What surveyors leave open is a few centimetres; more is another border than the one that was meant.
+    // Rounding leaves a few centimetres open; more is another border than the one that was meant.
     constexpr double widest = 0.1;
     if (gap > widest) {
-        modelNotes_.add(
-            border.stored->byte,
-            Xlate("the border of the parcel does not close: %1 metres are open").arg(QString::number(gap, 'f', 3)));
+        modelNotes_.add(border.stored->byte,
+                        Xlate("the border of the parcel does not close: there is a gap of %1 metres")
+                            .arg(QString::number(gap, 'f', 3)));
         return;
     }
     border.area = std::fabs(area);
@@ -124,17 +129,11 @@ struct ParcelRows::Variables
         {"Area", VARIABLE_AREA, [](const Rows &rows) { return valueOf(rows.border_->area); }},
         {"StatedArea", VARIABLE_AREA, [](const Rows &rows) { return valueOf(rows.border_->stored->area); }},
         {"Perimeter", VARIABLE_LENGTH, [](const Rows &rows) { return valueOf(rows.border_->perimeter); }},
-        {"Courses", VARIABLE_INTEGER, [](const Rows &rows) { return count(rows.border_->courses.size()); }},
+        {"Courses", VARIABLE_INTEGER, [](const Rows &rows) { return countOf(rows.border_->courses.size()); }},
         {"CentreNorthing", VARIABLE_COORDINATE,
-         [](const Rows &rows) {
-             const auto &centre = rows.border_->stored->centre.position;
-             return centre ? valueOf(centre->northing) : LandXmlValue();
-         }},
+         [](const Rows &rows) { return northingOf(rows.border_->stored->centre.position); }},
         {"CentreEasting", VARIABLE_COORDINATE,
-         [](const Rows &rows) {
-             const auto &centre = rows.border_->stored->centre.position;
-             return centre ? valueOf(centre->easting) : LandXmlValue();
-         }},
+         [](const Rows &rows) { return eastingOf(rows.border_->stored->centre.position); }},
     };
 };
 
@@ -171,7 +170,7 @@ struct CourseRows::Variables
         {"Parcel", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.border_->stored->name); }},
         {"Area", VARIABLE_AREA, [](const Rows &rows) { return valueOf(rows.border_->area); }},
         {"Perimeter", VARIABLE_LENGTH, [](const Rows &rows) { return valueOf(rows.border_->perimeter); }},
-        {"Course", VARIABLE_INTEGER, [](const Rows &rows) { return count(rows.index_ + 1); }},
+        {"Course", VARIABLE_INTEGER, [](const Rows &rows) { return countOf(rows.index_ + 1); }},
         {"Name", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(element(rows).name); }},
         {"Rotation", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(element(rows).rotation); }},
         {"StartNorthing", VARIABLE_COORDINATE,
@@ -192,9 +191,8 @@ struct CourseRows::Variables
         {"Length", VARIABLE_LENGTH, [](const Rows &rows) { return valueOf(rows.curve_->length()); }},
         {"Radius", VARIABLE_LENGTH,
          [](const Rows &rows) {
-             constexpr double infinite = std::numeric_limits<double>::infinity();
-             return rows.curve_->isLine() ? valueOf(infinite)
-                                          : ofArc(rows, std::fabs(1 / rows.curve_->startCurvature()));
+             const double radius = radiusOf(rows.curve_->startCurvature());
+             return rows.curve_->isLine() ? valueOf(radius) : ofArc(rows, radius);
          }},
         {"Deflection", VARIABLE_ANGLE,
          [](const Rows &rows) { return ofArc(rows, rows.curve_->turnTo(rows.curve_->length())); }},

@@ -27,7 +27,8 @@ protected:
     std::vector<ParcelBorder> borders_;
 
 private:
-    ParcelBorder borderOf(const LandXmlParcel &parcel, const LandXmlGeometry &geometry);
+    bool resolveReferences(const std::vector<LandXmlParcel *> &parcels);
+    ParcelBorder borderOf(const LandXmlParcel &parcel, LandXmlComparison &comparison);
     void measure(ParcelBorder &border, bool isWhole);
 
     std::vector<LandXmlParcel> parcels_;

@@ -1,5 +1,6 @@
 #include "PointRows.h"
 
+#include "LandXmlReferences.h"
 #include "ModelRows.h"
 #include "VariableType.h"
 #include "Xlate.h"
@@ -11,11 +12,23 @@ struct PointRows::Variables
 {
     using Rows = PointRows;
     static const std::string &owner(const Rows &rows) { return rows.owners_[rows.point_->owner]; }
+    /// A text of the point, or else of the point that it refers to.
+    static LandXmlValue text(const Rows &rows, const std::string &own,
+                             std::string_view LandXmlPointTable::Found::*other)
+    {
+        if (!own.empty() || !rows.referred_ || ((*rows.referred_).*other).empty()) {
+            return valueOf(own);
+        }
+        return (*rows.referred_).*other;
+    }
 
     static constexpr LandXmlGetter<Rows> getters[] = {
-        {"Name", VARIABLE_NUMBER, [](const Rows &rows) { return valueOf(rows.point_->name); }},
-        {"Code", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.point_->code); }},
-        {"Description", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.point_->description); }},
+        {"Name", VARIABLE_NUMBER,
+         [](const Rows &rows) { return text(rows, rows.point_->name, &LandXmlPointTable::Found::name); }},
+        {"Code", VARIABLE_TEXT,
+         [](const Rows &rows) { return text(rows, rows.point_->code, &LandXmlPointTable::Found::code); }},
+        {"Description", VARIABLE_TEXT,
+         [](const Rows &rows) { return text(rows, rows.point_->description, &LandXmlPointTable::Found::description); }},
         {"Group", VARIABLE_TEXT,
          [](const Rows &rows) { return rows.isOfSurfaces() ? LandXmlValue() : valueOf(owner(rows)); }},
         {"Surface", VARIABLE_TEXT,
@@ -97,8 +110,11 @@ bool PointRows::next()
     if (isKept_) {
         kept_.push_back(*point_);
     }
-    noteRepeated();
-    return take();
+    if (!take()) {
+        return false;
+    }
+    noteNames();
+    return true;
 }
 
 void PointRows::goTo(std::size_t index)
@@ -109,27 +125,36 @@ void PointRows::goTo(std::size_t index)
 
 bool PointRows::take()
 {
+    referred_.reset();
     height_ = point_->at.height;
     if (point_->at.position) {
         at_ = *point_->at.position;
         return true;
     }
     const LandXmlPointTable *points = pointTable();
-    const auto found = points != nullptr ? points->find(point_->at.reference) : std::nullopt;
-    if (!found) {
+    if (points == nullptr) {
+        return false;
+    }
+    referred_ = points->find(point_->at.reference);
+    if (!referred_) {
         fail(point_->at.byte,
              Xlate("the point \"%1\" is not in the file").arg(QString::fromStdString(point_->at.reference)));
         return false;
     }
-    at_ = found->position;
-    height_ = found->height;
+    at_ = referred_->position;
+    height_ = referred_->height;
     return true;
 }
 
-/// Points that others refer to by their names, and surfaces' points, are expected to have one each.
-void PointRows::noteRepeated()
+/// Notes names that several points have. Others refer to points by their names, so that each is expected to have its own; in
+/// a surface as well. A point that refers to its own name is the same point in another group.
+void PointRows::noteNames()
 {
-    if (point_->name.empty()) {
+    const std::string &reference = point_->at.reference;
+    if (referred_ && referred_->isAmbiguous) {
+        noteAmbiguous(reference, point_->at.byte, passNotes_);
+    }
+    if (point_->name.empty() || (referred_ && reference == point_->name)) {
         return;
     }
     std::size_t hash = std::hash<std::string>()(point_->name);
@@ -138,123 +163,8 @@ void PointRows::noteRepeated()
     }
     if (!seen_.insert(hash).second) {
         passNotes_.add(point_->at.byte,
-                       Xlate("the name \"%1\" stands for several points").arg(QString::fromStdString(point_->name)));
+                       Xlate("several points have the name \"%1\"").arg(QString::fromStdString(point_->name)));
     }
-}
-
-struct ProjectedRows::Variables
-{
-    using Rows = ProjectedRows;
-    static constexpr LandXmlGetter<Rows> getters[] = {
-        {"Alignment", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.route_->stored->name); }},
-        {"Station", VARIABLE_STATION, [](const Rows &rows) { return valueOf(rows.station_); }},
-        {"Region", VARIABLE_INTEGER,
-         [](const Rows &rows) {
-             return LandXmlValue(static_cast<double>(rows.route_->nameOf(rows.foot_.distance).region));
-         }},
-        {"Along", VARIABLE_LENGTH, [](const Rows &rows) { return valueOf(rows.foot_.distance); }},
-        {"Offset", VARIABLE_OFFSET, [](const Rows &rows) { return valueOf(rows.foot_.offset); }},
-        {"Distance", VARIABLE_DISTANCE, [](const Rows &rows) { return valueOf(std::fabs(rows.foot_.offset)); }},
-        {"Place", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.kind_); }},
-        {"Design", VARIABLE_ELEVATION, [](const Rows &rows) { return valueOf(rows.design_); }},
-        {"HeightDifference", VARIABLE_LENGTH, [](const Rows &rows) { return valueOf(rows.height_ - rows.design_); }},
-    };
-};
-
-ProjectedRows::ProjectedRows(LandXmlSource source) : PointRows(std::move(source)) {}
-
-std::vector<LandXmlVariable> ProjectedRows::variables() const
-{
-    std::vector<LandXmlVariable> variables = PointRows::variables();
-    for (LandXmlVariable &own : variablesOf(Variables::getters)) {
-        variables.push_back(std::move(own));
-    }
-    return variables;
-}
-
-LandXmlValue ProjectedRows::value(std::size_t variable) const
-{
-    return variable < ownVariables ? PointRows::value(variable)
-                                   : Variables::getters[variable - ownVariables].get(*this);
-}
-
-bool ProjectedRows::next()
-{
-    if (!isLoaded_) {
-        isLoaded_ = true;
-        if (!load()) {
-            route_ = nullptr;
-            return false;
-        }
-        // The file has been read through, and all was said. Rows that are to be kept still are.
-        isReaderHeard_ = false;
-        startReading();
-    }
-    return route_ != nullptr && PointRows::next();
-}
-
-bool ProjectedRows::load()
-{
-    if (!readAlignments(model_, {})) {
-        return false;
-    }
-    LandXmlNames alignments(source_.query.alignment);
-    for (const LandXmlRoute &route : model_.routes) {
-        if (alignments.matches(route.stored->name)) {
-            if (route_ != nullptr && source_.query.alignment.isEmpty()) {
-                fail(route.stored->byte, Xlate("the file has several alignments: the name of one was expected"));
-                return false;
-            }
-            route_ = route_ == nullptr ? &route : route_;
-        }
-    }
-    error_ = alignments.error(source_.file->path());
-    if (error_) {
-        return false;
-    }
-    if (route_ == nullptr) {
-        error_ = InputError{source_.file->path(), std::nullopt, Xlate("the file has no alignment")};
-        return false;
-    }
-    if (route_->fault) {
-        fail(*route_->fault);
-        return false;
-    }
-    if (route_->alignment.elements().empty()) {
-        fail(route_->stored->byte, Xlate("the alignment has no elements"));
-        return false;
-    }
-    for (const LandXmlGradeLine &line : route_->stored->gradeLines) {
-        gradeLines_.matches(line.name);
-    }
-    error_ = gradeLines_.error(source_.file->path());
-    if (error_) {
-        return false;
-    }
-    profile_ = route_->profile(source_.query.gradeLine.toStdString());
-    return true;
-}
-
-bool ProjectedRows::take()
-{
-    if (!PointRows::take()) {
-        return false;
-    }
-    foot_ = *nearestFoot(route_->alignment, at_);
-    station_ = notGiven;
-    design_ = notGiven;
-    switch (foot_.kind) {
-    case AlignmentFoot::Kind::Perpendicular: kind_.clear(); break;
-    case AlignmentFoot::Kind::Corner: kind_ = Xlate("outside of a corner").toStdString(); break;
-    case AlignmentFoot::Kind::BeforeStart: kind_ = Xlate("before the start").toStdString(); break;
-    case AlignmentFoot::Kind::AfterEnd: kind_ = Xlate("after the end").toStdString(); break;
-    case AlignmentFoot::Kind::Undetermined: kind_ = Xlate("at a centre").toStdString(); return true;
-    }
-    station_ = route_->nameOf(foot_.distance).station;
-    if (profile_ != nullptr) {
-        design_ = profile_->heightAt(foot_.distance + route_->stationing.start()).value_or(notGiven);
-    }
-    return true;
 }
 
 } // namespace kareport

@@ -1,7 +1,6 @@
 #pragma once
 
 #include "LandXmlRows.h"
-#include "Projection.h"
 
 #include <unordered_set>
 
@@ -34,8 +33,9 @@ protected:
 
     static const std::size_t ownVariables; ///< how many `PointRows` itself has
 
-    bool isReaderHeard_ = true; ///< what the reader notes has not been said already
+    bool isReaderHeard_ = true; ///< the notes of the reader are new: nothing has read the file before
     const LandXmlPoint *point_ = nullptr;
+    std::optional<LandXmlPointTable::Found> referred_; ///< the point that the one at hand refers to
     PlanePoint at_;
     double height_ = notGiven;
 
@@ -44,7 +44,7 @@ private:
 
     bool readMore();
     bool isOfSurfaces() const { return source_.query.kind == LandXmlListKind::SurfacePoints; }
-    void noteRepeated();
+    void noteNames();
 
     LandXmlNotes unheard_;
     std::unique_ptr<LandXmlReader> reader_;
@@ -55,34 +55,6 @@ private:
     bool isKept_ = false;
     std::vector<LandXmlPoint> kept_;
     std::unordered_set<std::size_t> seen_; ///< hashes of names
-};
-
-/// Points, projected onto an alignment.
-class ProjectedRows : public PointRows
-{
-public:
-    explicit ProjectedRows(LandXmlSource source);
-
-    std::vector<LandXmlVariable> variables() const override;
-    bool next() override;
-    LandXmlValue value(std::size_t variable) const override;
-
-protected:
-    bool take() override;
-
-private:
-    struct Variables;
-
-    bool load();
-
-    bool isLoaded_ = false;
-    AlignmentModel model_;
-    const LandXmlRoute *route_ = nullptr;
-    const VerticalProfile *profile_ = nullptr;
-    AlignmentFoot foot_{};
-    double station_ = notGiven;
-    double design_ = notGiven;
-    std::string kind_;
 };
 
 } // namespace kareport

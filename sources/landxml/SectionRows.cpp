@@ -27,8 +27,7 @@ struct SectionRows::Variables
          [](const Rows &rows) { return LandXmlValue(rows.surface_->isDesign ? 1.0 : 0.0); }},
         {"Side", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.surface_->side); }},
         {"Material", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.surface_->material); }},
-        {"Point", VARIABLE_INTEGER,
-         [](const Rows &rows) { return LandXmlValue(static_cast<double>(rows.index_ + 1)); }},
+        {"Point", VARIABLE_INTEGER, [](const Rows &rows) { return countOf(rows.index_ + 1); }},
         {"Code", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(point(rows).code); }},
         {"Offset", VARIABLE_OFFSET, [](const Rows &rows) { return valueOf(point(rows).offset); }},
         {"Elevation", VARIABLE_ELEVATION, [](const Rows &rows) { return valueOf(point(rows).height); }},
@@ -55,13 +54,10 @@ bool SectionRows::load()
 {
     LandXmlWants wants;
     wants.sections = true;
-    if (!readAlignments(model_, wants)) {
+    if (!readNamedAlignments(model_, wants)) {
         return false;
     }
     for (const LandXmlRoute &route : model_.routes) {
-        if (!isNamed(route.stored->name)) {
-            continue;
-        }
         for (const LandXmlSection &section : route.stored->sections) {
             for (const LandXmlSectionSurface &layer : section.surfaces) {
                 const std::size_t points = surfaces_.matches(layer.name) ? layer.points.size() : 0;

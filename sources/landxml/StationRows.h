@@ -20,7 +20,7 @@ protected:
     void take(std::size_t index) override;
 
 private:
-    static constexpr std::size_t most = 5000000; ///< rows; more come of an interval that nobody means
+    static constexpr std::size_t most = 5000000; ///< rows: an interval that gives more is a mistake
 
     struct Variables;
     struct Row
@@ -37,18 +37,16 @@ private:
 
     void lookAtNames(const LandXmlAlignment &alignment);
     bool addRoute(std::size_t index);
-    bool addInterval(const LandXmlRoute &route, std::vector<double> &distances);
-    bool addRound(const LandXmlRoute &route, std::vector<double> &distances) const;
-    void addStations(const LandXmlRoute &route, std::vector<double> &distances);
+    void noteOffsetsPastCentres(const LandXmlRoute &route);
     const LandXmlRoute::Piece *borderAt(double distance, bool &isEnd) const;
-    LandXmlValue offsetValue(std::size_t offset, std::size_t part) const;
+    LandXmlValue offsetValue(std::size_t offset, std::size_t variable) const;
 
     AlignmentModel model_;
     std::vector<Lines> lines_; ///< one for each route
     std::vector<Row> rows_;
     const LandXmlRoute *route_ = nullptr;
     double distance_ = 0;
-    CurvePlace place_;
+    std::optional<CurvePlace> place_;
     double sine_ = 0; ///< of the bearing
     double cosine_ = 1;
     std::optional<double> design_;

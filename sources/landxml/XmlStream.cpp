@@ -6,7 +6,6 @@
 #include <array>
 #include <expat.h>
 #include <string>
-#include <vector>
 
 namespace kareport
 {
@@ -28,12 +27,6 @@ QString utf8(std::string_view text)
     return QString::fromUtf8(text.data(), static_cast<qsizetype>(std::min(text.size(), longest)));
 }
 
-std::string_view prefixOf(std::string_view name)
-{
-    const std::size_t colon = name.find(':');
-    return colon == std::string_view::npos ? std::string_view() : name.substr(0, colon);
-}
-
 } // namespace
 
 std::optional<std::string_view> XmlAttributes::find(std::string_view name) const
@@ -45,60 +38,6 @@ std::optional<std::string_view> XmlAttributes::find(std::string_view name) const
     }
     return std::nullopt;
 }
-
-/// Which prefixes stand for the vocabulary of the outermost element.
-struct XmlStream::Vocabulary
-{
-    struct Binding
-    {
-        std::string prefix;
-        bool isOurs;
-        int depth;
-    };
-
-    std::string uri;
-    std::string rootPrefix;
-    std::vector<Binding> bindings;
-
-    void bind(const XmlAttributes &attributes, int depth)
-    {
-        for (const char *const *pair = attributes.pairs(); *pair != nullptr; pair += 2) {
-            const std::string_view name = pair[0];
-            if (!name.starts_with("xmlns") || (name.size() > 5 && name[5] != ':')) {
-                continue;
-            }
-            const std::string_view prefix = name.size() > 5 ? name.substr(6) : std::string_view();
-            if (depth == 1 && prefix == rootPrefix) {
-                uri = pair[1];
-            }
-            bindings.push_back({std::string(prefix), uri == pair[1], depth});
-        }
-        if (depth == 1) { // the outermost element's own binding may stand after others
-            for (Binding &binding : bindings) {
-                const auto value = attributes.find(binding.prefix.empty() ? "xmlns" : "xmlns:" + binding.prefix);
-                binding.isOurs = value == uri;
-            }
-        }
-    }
-
-    bool has(std::string_view name) const
-    {
-        const std::string_view prefix = prefixOf(name);
-        for (auto binding = bindings.rbegin(); binding != bindings.rend(); ++binding) {
-            if (binding->prefix == prefix) {
-                return binding->isOurs;
-            }
-        }
-        return prefix == rootPrefix; // a prefix that nobody has declared
-    }
-
-    void unbind(int depth)
-    {
-        while (!bindings.empty() && bindings.back().depth >= depth) {
-            bindings.pop_back();
-        }
-    }
-};
 
 /// What the parser calls. An exception must not pass through it: it is kept until the parser has come back.
 struct XmlStream::Callbacks
@@ -133,6 +72,18 @@ struct XmlStream::Callbacks
         if (static_cast<XmlStream *>(data)->wantsText_) {
             guarded(data, [&](XmlStream &stream) {
                 stream.handler_.text({characters, static_cast<std::size_t>(count)});
+            });
+        }
+    }
+
+    static void documentType(void *data, const char *, const char *file, const char *, int)
+    {
+        if (file != nullptr) {
+            guarded(data, [&](XmlStream &stream) {
+                stream.fail(stream.currentByte(),
+                            Xlate("the document type is in another file, \"%1\", which is not read: "
+                                  "a file that needs no other was expected")
+                                .arg(utf8(file)));
             });
         }
     }
@@ -174,10 +125,7 @@ struct XmlStream::Callbacks
 };
 
 XmlStream::XmlStream(std::shared_ptr<const FileBytes> file, XmlHandler &handler)
-    : file_(std::move(file)),
-      handler_(handler),
-      parser_(XML_ParserCreate(nullptr)),
-      vocabulary_(std::make_unique<Vocabulary>())
+    : file_(std::move(file)), handler_(handler), parser_(XML_ParserCreate(nullptr))
 {
     if (parser_ == nullptr) {
         throw std::bad_alloc();
@@ -185,6 +133,7 @@ XmlStream::XmlStream(std::shared_ptr<const FileBytes> file, XmlHandler &handler)
     XML_SetUserData(parser_, this);
     XML_SetElementHandler(parser_, Callbacks::start, Callbacks::end);
     XML_SetCharacterDataHandler(parser_, Callbacks::text);
+    XML_SetStartDoctypeDeclHandler(parser_, Callbacks::documentType);
     XML_SetEntityDeclHandler(parser_, Callbacks::entity);
     XML_SetSkippedEntityHandler(parser_, Callbacks::skippedEntity);
     XML_SetUnknownEncodingHandler(parser_, Callbacks::encoding, nullptr);
@@ -250,7 +199,7 @@ void XmlStream::failParsing()
     if (code == XML_ERROR_NO_MEMORY) {
         throw std::bad_alloc();
     }
-    QString text = Xlate("the file is no well-formed XML: %1").arg(QString::fromUtf8(XML_ErrorString(code)));
+    QString text = Xlate("the file is not well-formed XML: %1").arg(QString::fromUtf8(XML_ErrorString(code)));
     if (code == XML_ERROR_UNKNOWN_ENCODING) {
         text = Xlate(
             "the encoding of the file is not known: UTF-8, UTF-16, ISO-8859-1, US-ASCII or windows-1252 was expected");
@@ -269,11 +218,8 @@ void XmlStream::started(const char *name, const char *const *attributes)
     }
     wantsText_ = false;
     const XmlAttributes found(attributes);
-    if (depth_ == 1) {
-        vocabulary_->rootPrefix = prefixOf(name);
-    }
-    vocabulary_->bind(found, depth_);
-    if (!vocabulary_->has(name)) {
+    vocabulary_.begin(name, attributes, depth_);
+    if (!vocabulary_.has(name)) {
         handler_.foreignElement(name);
         passedOverFrom_ = depth_;
         return;
@@ -284,6 +230,7 @@ void XmlStream::started(const char *name, const char *const *attributes)
     }
     const auto interest = handler_.startElement(local, found);
     wantsText_ = interest == XmlHandler::Interest::Text;
+    textWanted_.set(static_cast<std::size_t>(depth_), wantsText_);
     if (interest == XmlHandler::Interest::None) {
         passedOverFrom_ = depth_;
     }
@@ -292,13 +239,14 @@ void XmlStream::started(const char *name, const char *const *attributes)
 void XmlStream::ended()
 {
     if (passedOverFrom_ == 0) {
-        wantsText_ = false;
         handler_.endElement();
     } else if (passedOverFrom_ == depth_) {
         passedOverFrom_ = 0;
     }
-    vocabulary_->unbind(depth_);
+    vocabulary_.end(depth_);
     --depth_;
+    // The text after an element belongs to the one around it.
+    wantsText_ = passedOverFrom_ == 0 && textWanted_.test(static_cast<std::size_t>(depth_));
 }
 
 } // namespace kareport

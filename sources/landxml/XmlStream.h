@@ -3,9 +3,11 @@
 #include "FileBytes.h"
 #include "FilePlaces.h"
 #include "InputError.h"
+#include "XmlVocabulary.h"
 
 #include <QString>
 
+#include <bitset>
 #include <exception>
 #include <memory>
 #include <optional>
@@ -49,7 +51,7 @@ public:
     ///              not ended either
     virtual Interest startElement(std::string_view name, const XmlAttributes &attributes) = 0;
     virtual void endElement() = 0;
-    /// A piece of text in the innermost element.
+    /// A piece of text in the innermost element. Elements may stand between two pieces.
     virtual void text(std::string_view piece) = 0;
     /// An element of another vocabulary, which is passed over with all in it. @param name  with its prefix
     virtual void foreignElement(std::string_view name) = 0;
@@ -58,8 +60,8 @@ public:
 /// Reads an XML file from start to end in one pass, without a document in memory. What belongs to the vocabulary of the
 /// outermost element is told, whatever its prefix is.
 ///
-/// No other file is ever opened, and a file that declares entities is refused: nothing that is exchanged between programs
-/// needs them, and they can make a small file endless. Depth and the size of a tag are bounded.
+/// No other file is ever opened. A file that declares entities, or whose document type is in another file, is refused: files
+/// that programs exchange need neither, and entities can make a small file endless. Depth and the size of a tag are bounded.
 class XmlStream
 {
 public:
@@ -88,7 +90,6 @@ public:
 
 private:
     struct Callbacks;
-    struct Vocabulary;
 
     void started(const char *name, const char *const *attributes);
     void ended();
@@ -97,11 +98,12 @@ private:
     std::shared_ptr<const FileBytes> file_;
     XmlHandler &handler_;
     XML_ParserStruct *parser_;
-    std::unique_ptr<Vocabulary> vocabulary_;
+    XmlVocabulary vocabulary_;
     std::size_t position_ = 0;
     int depth_ = 0;
-    int passedOverFrom_ = 0; ///< depth of the element that nothing is told of; 0 when there is none
-    bool wantsText_ = false;
+    int passedOverFrom_ = 0;              ///< depth of the element that nothing is told of; 0 when there is none
+    bool wantsText_ = false;              ///< of the innermost element
+    std::bitset<deepest + 1> textWanted_; ///< of the elements that are open, by their depth
     bool isStopped_ = false;
     std::optional<InputError> error_;
     std::exception_ptr thrown_;

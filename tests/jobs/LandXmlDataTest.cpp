@@ -99,11 +99,11 @@ TEST(LandXmlData, WhatIsSaidOfTheFileIsNoted)
     EXPECT_FALSE(job.error);
     ASSERT_EQ(job.notes.said().size(), 1U);
     EXPECT_TRUE(
-        job.notes.said().front().message().endsWith(u"road.xml:3:11: note: the name \"A1\" stands for several points"));
+        job.notes.said().front().message().endsWith(u"road.xml:3:11: note: several points have the name \"A1\""));
     EXPECT_TRUE(job.notes.toJson().contains("\"kind\": \"difference\""));
     run(job, points, pointsStep, road(twice), strict);
     ASSERT_TRUE(job.error);
-    EXPECT_TRUE(job.error->message().endsWith(u"road.xml:3:11: error: the name \"A1\" stands for several points"));
+    EXPECT_TRUE(job.error->message().endsWith(u"road.xml:3:11: error: several points have the name \"A1\""));
     const QByteArray block = R"({"block": "First", "data": "d"})";
     run(job, points, block, road(twice), strict);
     EXPECT_TRUE(job.error) << "of a block as well";

@@ -35,6 +35,10 @@ TEST(FilePlaces, AreOfLinesAndCharacters)
                     "\0a\xD8\x34\xDD\x1E\0b",
                     10),
          8, "1:3"},
+        {"<?xml version='1.0' encoding='windows-1252'?>\n\x84\x93x", 48, "2:3"},
+        {"<?xml version=\"1.0\" encoding=\"ISO-8859-1\"?>\n\xA0\xBFx", 46, "2:3"},
+        {"<?xml version='1.0' encoding='UTF-8'?>\n\xC3\x84x", 41, "2:2"},
+        {"<?xml version='1.0'?>\n\xC3\x84x", 24, "2:2"},
     };
     for (const Row &row : rows) {
         const auto file = FileBytes::holding(QString(), row.file);

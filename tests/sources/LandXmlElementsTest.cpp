@@ -132,7 +132,7 @@ TEST(LandXmlElements, AFullCircleIsToldFromNothingByItsLength)
                              "><Start>1100 500</Start><Center>1100 600</Center><End>1100 500</End></Curve>")),
             queryOf(Kind::Elements));
         EXPECT_EQ(file.rows(), QStringList()) << nothing;
-        EXPECT_EQ(file.notes(), QStringList(u"5:1: the element has no length and is passed over"_qs)) << nothing;
+        EXPECT_EQ(file.notes(), QStringList(u"5:1: the element has no length and was left out"_qs)) << nothing;
     }
 }
 
@@ -174,9 +174,9 @@ TEST(LandXmlElements, WhatDiffersFromTheGeometryIsNotedWithBothValues)
         {"<Line staStart='5'><Start>0 0</Start><End>10 0</End></Line>",
          "5:1: staStart is 5.0000 in the file, but 0.0000 by its geometry", "a station"},
         {"<Line><Start>0 0</Start><End>10 0</End></Line>\n<Line><Start>10.5 0</Start><End>20 0</End></Line>",
-         "6:1: Start is 0.5000 in the file, but 0.0000 by its geometry", "a gap"},
+         "6:1: the element begins 0.5000 from the end of the element before", "a gap"},
         {"<Line><Start>0 0</Start><End>10 0</End></Line>\n<Line><Start>10 0</Start><End>10 0</End></Line>",
-         "6:1: the element has no length and is passed over", "nothing"},
+         "6:1: the element has no length and was left out", "nothing"},
     };
     for (const Row &row : rows) {
         LandXmlFile file(fileOf(alignment(row.elements)), queryOf(Kind::Elements));
@@ -304,7 +304,7 @@ TEST(LandXmlElements, TheirPointsMayBeReferred)
 
 TEST(LandXmlElements, AttributesThatAreNoNumbersAreErrors)
 {
-    for (const char *attribute : {"length='1,5'", "staStart='x'", "dir='1.2.3'", "length='nan'"}) {
+    for (const char *attribute : {"length='1,5'", "staStart='x'", "length='nan'", "length='INF'", "staStart='INF'"}) {
         LandXmlFile file(
             fileOf(alignment(QByteArray("<Line ") + attribute + "><Start>0 0</Start><End>10 0</End></Line>")),
             queryOf(Kind::Elements));
@@ -324,6 +324,123 @@ TEST(LandXmlElements, OfOneAlignmentAreListedAlone)
                     {QStringLiteral("Alignment"), QStringLiteral("Length"), QStringLiteral("Elements"),
                      QStringLiteral("EndEasting")});
     EXPECT_EQ(all.rows(2), QStringList({u"road|307.08|3|650.00"_qs, u"lane|1.00|1|0.00"_qs}));
+}
+
+TEST(LandXmlElements, WithoutGeometryHaveTheirCoordinatesAsStored)
+{
+    LandXmlFile file(fileOf(alignment("<Curve radius='20'><Start name='A'>1 2</Start><Center>3 4</Center><End>5 6</End>"
+                                      "<PI>7 8</PI></Curve><Line length='3'><Start>5 6</Start></Line>")),
+                     queryOf(Kind::Elements),
+                     {QStringLiteral("StartNorthing"), QStringLiteral("StartEasting"), QStringLiteral("EndNorthing"),
+                      QStringLiteral("EndEasting"), QStringLiteral("CentreNorthing"), QStringLiteral("CentreEasting"),
+                      QStringLiteral("PINorthing"), QStringLiteral("PIEasting"), QStringLiteral("StartBearing")});
+    EXPECT_EQ(file.rows(0), QStringList({u"1|2|5|6|3|4|7|8|-"_qs, u"5|6|-|-|-|-|-|-|-"_qs}));
+}
+
+TEST(LandXmlElements, DirectionsOfAFileAreAllMeasuredInOneWay)
+{
+    // Towards north-east, south-east, south-west: clockwise from north.
+    const auto line = [](const char *direction, const char *end) {
+        return QByteArray("<Line dir='") + direction + "'><Start>0 0</Start><End>" + end + "</End></Line>\n";
+    };
+    const auto notesOf = [&](const QByteArray &elements) {
+        LandXmlFile file(fileOf(alignment(elements)), queryOf(Kind::Elements));
+        file.rows();
+        return file.notes().filter(u"dir"_qs);
+    };
+    const QByteArray sound = line("45", "10 10") + line("135", "-10 10") + line("225", "-10 -10");
+    EXPECT_EQ(notesOf(sound), QStringList());
+    EXPECT_EQ(notesOf(sound + line("315", "-10 10")),
+              QStringList(u"8:1: dir is 315.00000 in the file, but 135.00000 by its geometry"_qs))
+        << "it would fit if it alone were measured from east";
+    EXPECT_EQ(notesOf(line("30", "10 17.3205081") + line("330", "10 -17.3205081") + line("60", "17.3205081 10")),
+              QStringList({u"6:1: dir is 330.00000 in the file, but 150.00000 by its geometry"_qs}))
+        << "counterclockwise from east, as most are";
+}
+
+TEST(LandXmlElements, NotesOfDirectionsAreInTheUnitOfTheFile)
+{
+    struct Row
+    {
+        const char *unit;
+        const char *direction;
+        const char *note;
+    };
+    constexpr Row rows[] = {
+        {"grads", "100.01", "dir is 100.01000 in the file, but 100.00000 by its geometry"},
+        {"radians", "1.58", "dir is 1.5800000 in the file, but 1.5707963 by its geometry"},
+        {"decimal degrees", "90.5", "dir is 90.50000 in the file, but 90.00000 by its geometry"},
+        {"decimal dd.mm.ss", "90.3015", "dir is 90.301500 in the file, but 90.000000 by its geometry"},
+    };
+    for (const Row &row : rows) {
+        QByteArray content =
+            fileOf(alignment(QByteArray("<Line dir='") + row.direction + "'><Start>0 0</Start><End>0 10</End></Line>"));
+        content.replace("directionUnit=\"decimal degrees\"", QByteArray("directionUnit=\"") + row.unit + "\"");
+        LandXmlFile file(content, queryOf(Kind::Elements));
+        file.rows();
+        EXPECT_EQ(file.notes(), QStringList(u"5:1: "_qs + QLatin1StringView(row.note))) << row.unit;
+    }
+}
+
+TEST(LandXmlElements, ADirectionThatCannotBeReadIsNoted)
+{
+    for (const char *attribute : {"dir='1.2.3'", "dir='N 45 E'"}) {
+        LandXmlFile file(
+            fileOf(alignment(QByteArray("<Line ") + attribute + "><Start>0 0</Start><End>10 0</End></Line>")),
+            queryOf(Kind::Elements));
+        EXPECT_EQ(file.rows().size(), 1) << attribute << ": no geometry depends on it";
+        EXPECT_FALSE(file.list->error()) << attribute;
+        ASSERT_EQ(file.notes().size(), 1) << attribute;
+        EXPECT_TRUE(file.notes().front().contains(u"an angle in the file's unit was expected"));
+    }
+}
+
+TEST(LandXmlElements, AngleOfACurveToTheLeftMayBeBelowZero)
+{
+    LandXmlFile file(
+        fileOf(alignment("<Curve rot='ccw' radius='5' delta='-286.26'><Start>0 0</Start><End>6 0</End></Curve>")),
+        queryOf(Kind::Elements));
+    EXPECT_NEAR(file.number(0, "CentreEasting"), 4, 1e-9) << "the long way";
+    LandXmlFile circle(fileOf(alignment("<Curve rot='ccw' delta='-360'><Start>1100 500</Start><Center>1100 600</Center>"
+                                        "<End>1100 500</End></Curve>")),
+                       queryOf(Kind::Elements), {QStringLiteral("Length")});
+    EXPECT_EQ(circle.rows(3), QStringList(u"628.319"_qs));
+}
+
+TEST(LandXmlElements, ThatEndWhereTheyStartAndAreShorterThanTheToleranceAreLeftOut)
+{
+    const QByteArray ends = "<Start>10 0</Start><End>10 0</End>";
+    const QByteArray line = "<Line><Start>0 0</Start><End>10 0</End></Line>\n";
+    for (const QByteArray &element :
+         {"<Line length='0.0004'>" + ends + "</Line>",
+          "<Curve rot='cw' radius='5' length='0.0004'>" + ends + "</Curve>",
+          "<Spiral length='0.0004' rot='cw' spiType='clothoid' radiusStart='INF' radiusEnd='50'>" + ends + "</Spiral>"})
+    {
+        LandXmlFile file(fileOf(alignment(line + element)), queryOf(Kind::Stations), {QStringLiteral("Station")});
+        EXPECT_EQ(file.rows(3), QStringList({u"0.000"_qs, u"10.000"_qs})) << element.constData();
+        EXPECT_FALSE(file.list->error()) << element.constData();
+        EXPECT_EQ(file.notes(), QStringList(u"6:1: the element has no length and was left out"_qs))
+            << element.constData();
+    }
+    LandXmlFile longer(fileOf(alignment(line + "<Line length='9'>" + ends + "</Line>")), queryOf(Kind::Stations));
+    EXPECT_EQ(longer.rows(), QStringList());
+    EXPECT_TRUE(longer.list->error()) << "nine metres that lead nowhere are wrong";
+}
+
+TEST(LandXmlElements, RadiiAloneMayBeInfinite)
+{
+    LandXmlFile file(
+        fileOf(alignment("<Spiral length='10' rot='cw' spiType='clothoid' radiusStart='INF' radiusEnd='50'>"
+                         "<Start>0 0</Start><End>10 0.3</End></Spiral>")),
+        queryOf(Kind::Elements), {QStringLiteral("StartRadius")});
+    EXPECT_EQ(file.rows(), QStringList(u"inf"_qs));
+    for (const char *element : {"<Line length='INF'/>", "<Line length='1e308'/>"}) {
+        QByteArray content = fileOf(alignment(element));
+        content.replace("\"meter\"", "\"kilometer\"");
+        LandXmlFile wrong(content, queryOf(Kind::Elements));
+        EXPECT_EQ(wrong.rows(), QStringList()) << element;
+        EXPECT_EQ(placeText(wrong.list->error()), u"5:1"_qs) << element;
+    }
 }
 
 } // namespace

@@ -126,4 +126,62 @@ TEST(LandXmlHostile, NotesAreBounded)
     EXPECT_TRUE(notes[100].startsWith(u"and "));
 }
 
+TEST(LandXmlHostile, NoElementIsDroppedWhereTheLastPieceOfACurveIsTheLastThatIsAllowed)
+{
+    // 500000 pieces and 16 for each of nine elements: what eight spirals of 62518 pieces take.
+    const QByteArray spiral = "<Spiral length='62517.5' rot='cw' spiType='clothoid' radiusStart='INF' radiusEnd='1'>"
+                              "<Start>0 0</Start><End>1 1</End></Spiral>";
+    const QByteArray line = "<Line><Start>1 1</Start><End>2 2</End></Line>";
+    LandXmlFile file(fileOf(alignment(spiral.repeated(8) + line)), queryOf(Kind::Elements));
+    EXPECT_EQ(file.rows(), QStringList());
+    EXPECT_TRUE(file.list->error()) << "eight rows would lack the last one";
+}
+
+TEST(LandXmlHostile, ElementsWithoutContentDoNotFillTheMemory)
+{
+    const QByteArray geometry = alignment(QByteArray("<Line/>").repeated(300000));
+    const QByteArray list = "<IrregularLine><Start>0 0</Start><End>1 1</End><PntList2D>" +
+                            QByteArray("0 0 ").repeated(400000) + "</PntList2D></IrregularLine>";
+    for (const auto &[kind, content] :
+         {std::pair(Kind::Elements, geometry), std::pair(Kind::Elements, alignment(list)),
+          std::pair(Kind::Parcels, "<Parcels>" + QByteArray("<Parcel/>").repeated(300000) + "</Parcels>"),
+          std::pair(Kind::Alignments, "<Alignments>" + QByteArray("<Alignment/>").repeated(300000) + "</Alignments>"),
+          std::pair(Kind::CrossSections, "<Alignments><Alignment><CrossSects>" +
+                                             QByteArray("<CrossSect sta='1'/>").repeated(300000) +
+                                             "</CrossSects></Alignment></Alignments>")})
+    {
+        LandXmlFile file(fileOf(content), queryOf(kind));
+        EXPECT_EQ(file.rows(), QStringList());
+        ASSERT_TRUE(file.list->error()) << keyOf(kind).toString().toStdString();
+        EXPECT_TRUE(file.list->error()->text.contains(u"too many elements without content"));
+    }
+    // What a program writes at the least, many times.
+    QByteArray sound;
+    for (int i = 0; i < 60000; ++i) {
+        const QByteArray n = QByteArray::number(i % 10);
+        sound += "<Line><Start>" + n + " 0</Start><End>" + n + " 1</End></Line>";
+    }
+    LandXmlFile file(fileOf(alignment(sound)), queryOf(Kind::Elements), {QStringLiteral("Element")});
+    EXPECT_EQ(file.rows().size(), 60000);
+    EXPECT_FALSE(file.list->error());
+}
+
+TEST(LandXmlHostile, PointsAreNotProjectedOntoCoils)
+{
+    QByteArray points = "<CgPoints>";
+    for (int i = 0; i < 20000; ++i) {
+        points += "<CgPoint>" + QByteArray::number(i % 100) + " 3</CgPoint>";
+    }
+    points += "</CgPoints>";
+    const QByteArray spiral = "<Spiral length='60000' rot='cw' spiType='clothoid' radiusStart='INF' radiusEnd='1'>"
+                              "<Start>0 0</Start><End>1 1</End></Spiral>";
+    LandXmlFile coil(fileOf(points + alignment(spiral)), queryOf(Kind::OffsetsOf));
+    EXPECT_EQ(coil.rows(), QStringList());
+    EXPECT_TRUE(coil.list->error() && coil.list->error()->text.contains(u"wind round too often"));
+    const QByteArray ramp =
+        "<Curve rot='cw' length='2000'><Start>0 0</Start><Center>0 50</Center><End>0.001 0</End></Curve>";
+    LandXmlFile turns(fileOf(points + alignment(ramp)), queryOf(Kind::OffsetsOf), {QStringLiteral("Offset")});
+    EXPECT_EQ(turns.rows().size(), 20000) << "a ramp of a few turns is no coil";
+}
+
 } // namespace

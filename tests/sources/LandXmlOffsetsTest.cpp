@@ -110,4 +110,29 @@ TEST(LandXmlOffsets, AnAlignmentWithoutGeometryIsAnError)
     EXPECT_TRUE(none.list->error());
 }
 
+TEST(LandXmlOffsets, AtACentreThereIsNoPlaceAlongTheAlignment)
+{
+    LandXmlFile file(
+        fileOf(points("1100 600") + alignment("<Curve rot='cw'><Start>1100 500</Start><Center>1100 600</Center>"
+                                              "<End>1200 600</End></Curve>")),
+        queryOf(Kind::OffsetsOf),
+        {QStringLiteral("Station"), QStringLiteral("Region"), QStringLiteral("Along"), QStringLiteral("Place")});
+    EXPECT_EQ(file.rows(0), QStringList(u"-|-|-|at a centre"_qs));
+}
+
+TEST(LandXmlOffsets, APointThatNoNumberReachesHasNoPlace)
+{
+    for (const char *far : {"<Start>-1.7e308 -1.7e308</Start><End>-1.6e308 -1.6e308</End>",
+                            "<Start>-1.7e308 1.7e308</Start><End>-1.6e308 1.79e308</End>"})
+    {
+        for (const char *point : {"1.7e308 1.7e308", "1.7e308 -1.7e308"}) {
+            LandXmlFile file(fileOf(alignment(QByteArray("<Line>") + far + "</Line>") + points(point)),
+                             queryOf(Kind::OffsetsOf),
+                             {QStringLiteral("Name"), QStringLiteral("Station"), QStringLiteral("Region"),
+                              QStringLiteral("Offset"), QStringLiteral("Place")});
+            EXPECT_EQ(file.rows(), QStringList(u"p|-|-|-|too far away"_qs)) << far << " and " << point;
+        }
+    }
+}
+
 } // namespace

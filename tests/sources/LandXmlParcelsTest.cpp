@@ -78,7 +78,7 @@ TEST(LandXmlParcels, WhatDoesNotFitIsNoted)
     const Row rows[] = {
         {parcel("name='1' area='150'"), "4:10: area is 150.0000 in the file, but 139.2699 by its geometry", "139.270"},
         {"<Parcel><CoordGeom>" + line(0, 0, 10, 0) + line(10, 0, 10, 10) + "</CoordGeom></Parcel>",
-         "4:10: the border of the parcel does not close: 14.142 metres are open", "-"},
+         "4:10: the border of the parcel does not close: there is a gap of 14.142 metres", "-"},
         {"<Parcel><CoordGeom>" + line(0, 0, 10, 0) + line(10, 0, 10, 10) +
              "<Line><Start>10 10</Start></Line></CoordGeom></Parcel>",
          "End was expected", "-"},
@@ -109,6 +109,22 @@ TEST(LandXmlParcels, AreasOfAcresAreSquareMetres)
     EXPECT_NEAR(file.number(0, "StatedArea"), 4046.8564224, 1e-9);
     EXPECT_NEAR(file.number(0, "Area"), 4046.856, 0.002);
     EXPECT_EQ(file.notes(), QStringList());
+}
+
+TEST(LandXmlParcels, TheToleranceOfAreasIsInProportionToThatOfTheJob)
+{
+    for (const auto &[tolerance, notes] : {std::pair(0.002, 1), std::pair(0.02, 0)}) {
+        LandXmlQuery query = queryOf(Kind::Parcels);
+        query.tolerance.length = tolerance;
+        LandXmlFile file(fileOf("<Parcels>" + parcel("name='1' area='140'") + "</Parcels>"), query);
+        file.rows();
+        EXPECT_EQ(file.notes().size(), notes) << tolerance;
+    }
+    LandXmlQuery strict = queryOf(Kind::Parcels);
+    strict.tolerance.length = 0;
+    LandXmlFile file(fileOf("<Parcels>" + parcel("name='1' area='139.27'") + "</Parcels>"), strict);
+    file.rows();
+    EXPECT_EQ(file.notes().filter(u"area is"_qs).size(), 1) << "no tolerance at all";
 }
 
 } // namespace

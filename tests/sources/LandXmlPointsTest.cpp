@@ -139,7 +139,7 @@ TEST(LandXmlPoints, NamesThatStandTwiceAreNoted)
         queryOf(Kind::Points));
     for (int round = 0; round < 2; ++round) {
         EXPECT_EQ(file.rows().size(), 4) << "each is a row";
-        EXPECT_EQ(file.notes(), QStringList(QStringLiteral("5:1: the name \"1\" stands for several points"))) << round;
+        EXPECT_EQ(file.notes(), QStringList(QStringLiteral("5:1: several points have the name \"1\""))) << round;
     }
 }
 
@@ -174,7 +174,7 @@ TEST(LandXmlPoints, ASignThatALineEndHasPartedBelongsToItsNumber)
     EXPECT_EQ(file.number(0, "Easting"), -2);
     EXPECT_EQ(file.row(1), u"null"_qs);
     ASSERT_EQ(file.notes().size(), 1);
-    EXPECT_TRUE(file.notes().front().contains(u"signs stand apart"));
+    EXPECT_TRUE(file.notes().front().contains(u"signs are separated"));
 }
 
 /// Points whose numbers are told by their names, in lines of changing length, so that the file's pieces part each of them
@@ -300,7 +300,7 @@ TEST(LandXmlPoints, AVersionThatIsNotKnownIsNoted)
         "<LandXML version='3.1'><Units><Metric linearUnit='meter'/></Units><CgPoints/></LandXML>";
     LandXmlFile file(content, queryOf(Kind::Points));
     EXPECT_EQ(file.rows(), QStringList());
-    EXPECT_EQ(file.notes(), QStringList(u"1:1: the file is of version 3.1: what is read are versions 1.0 to 2.0"_qs));
+    EXPECT_EQ(file.notes(), QStringList(u"1:1: the file is of version 3.1: versions 1.0 to 2.0 are known"_qs));
 }
 
 TEST(LandXmlPoints, ListsHaveKeys)
@@ -314,6 +314,29 @@ TEST(LandXmlPoints, ListsHaveKeys)
         EXPECT_FALSE(LandXmlList::variables(queryOf(*kind)).empty()) << key;
     }
     EXPECT_FALSE(landXmlListFromKey(u"Points"));
+}
+
+TEST(LandXmlPoints, NumbersAfterAnElementCount)
+{
+    LandXmlFile file(fileOf("<CgPoints><CgPoint name='1'>10 20<Feature/>30</CgPoint>"
+                            "<CgPoint name='2'>1<x:a xmlns:x='v'/>2 3</CgPoint></CgPoints>"),
+                     queryOf(Kind::Points),
+                     {QStringLiteral("Northing"), QStringLiteral("Easting"), QStringLiteral("Elevation")});
+    EXPECT_EQ(file.rows(0), QStringList({u"10|20|30"_qs, u"1|2|3"_qs})) << "and an element parts two of them";
+}
+
+TEST(LandXmlPoints, NotesAreThoseOfASortedListToo)
+{
+    LandXmlFile file(
+        fileOf("<CgPoints><CgPoint name='1'>1 1</CgPoint>\n<CgPoint name='1'>0 0</CgPoint></CgPoints><Roadways/>"),
+        queryOf(Kind::Points), {QStringLiteral("Northing")});
+    file.list->Sort({file.id("Northing")});
+    for (int round = 0; round < 2; ++round) {
+        EXPECT_EQ(file.rows(0), QStringList({u"0"_qs, u"1"_qs}));
+        EXPECT_EQ(file.notes(), QStringList({u"5:1: several points have the name \"1\""_qs,
+                                             u"Roadways: 1 in the file, which no list reads"_qs}))
+            << round;
+    }
 }
 
 } // namespace

@@ -54,8 +54,9 @@ TEST(LandXmlSections, WhatIsOddIsNoted)
             "<CrossSectPnt dataFormat='Offset Elevation'>7 8</CrossSectPnt></DesignCrossSectSurf></CrossSect>"),
         queryOf(Kind::CrossSections), {QStringLiteral("Offset")});
     EXPECT_EQ(file.rows(0), QStringList({u"1"_qs, u"7"_qs}));
-    EXPECT_EQ(file.notes(), QStringList({u"9:1: the list of numbers ends within a point, which is passed over"_qs,
-                                         u"CrossSectPnt Slope Distance: 1 in the file, which no list reads"_qs}));
+    EXPECT_EQ(file.notes(),
+              QStringList({u"9:1: the list of numbers ends in the middle of a point, which was left out"_qs,
+                           u"CrossSectPnt Slope Distance: 1 in the file, which no list reads"_qs}));
 }
 
 TEST(LandXmlSections, BesideAnAlignmentWithoutGeometryHaveNoCoordinates)

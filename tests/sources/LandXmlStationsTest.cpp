@@ -229,4 +229,161 @@ TEST(LandXmlStations, AnAlignmentWithoutElementsHasNone)
     EXPECT_FALSE(file.list->error());
 }
 
+TEST(LandXmlStations, AnEquationKeepsItsNamesBesideABorder)
+{
+    // The border is at 50, and the equations are nearer to it than places that are one row.
+    const QByteArray elements = "<Line><Start>0 0</Start><End>50 0</End></Line>"
+                                "<Line><Start name='B'>50 0</Start><End>100 0</End></Line>";
+    struct Row
+    {
+        const char *internal;
+        const char *row;
+    };
+    for (const Row &row : {Row{"50.00005", "500.00000|50.00005|1|B"}, Row{"49.99995", "500.00000|49.99995|1|B"}}) {
+        LandXmlQuery query = everyTenth();
+        query.stations = {50.00001};
+        LandXmlFile file(
+            fileOf(alignment(elements, "name='road'",
+                             QByteArray("<StaEquation staInternal='") + row.internal + "' staAhead='500'/>")),
+            query,
+            {QStringLiteral("Station"), QStringLiteral("StationBack"), QStringLiteral("Region"),
+             QStringLiteral("Point")});
+        const QStringList rows = file.rows(5);
+        EXPECT_EQ(rows.value(2), QString::fromLatin1(row.row));
+        EXPECT_EQ(rows.size(), 5) << "0, 25, 50, 75 and 100 in all";
+    }
+    LandXmlFile two(fileOf(alignment(straight, "name='road'",
+                                     "<StaEquation staInternal='50' staAhead='500'/>"
+                                     "<StaEquation staInternal='50.00005' staAhead='900'/>")),
+                    queryOf(Kind::Stations), {QStringLiteral("Station")});
+    EXPECT_EQ(two.rows(2), QStringList({u"0.00"_qs, u"500.00"_qs, u"900.00"_qs, u"950.00"_qs})) << "each has names";
+}
+
+TEST(LandXmlStations, AnEquationMayBeAtTheStart)
+{
+    LandXmlQuery query = everyTenth();
+    query.fromRound = true;
+    LandXmlFile file(fileOf(alignment(straight, "name='road' staStart='10'",
+                                      "<StaEquation staInternal='10' staBack='10' staAhead='510'/>")),
+                     query, {QStringLiteral("Station"), QStringLiteral("StationBack"), QStringLiteral("Along")});
+    EXPECT_EQ(file.rows(0), QStringList({u"510|10|0"_qs, u"525|-|15"_qs, u"550|-|40"_qs, u"575|-|65"_qs, u"600|-|90"_qs,
+                                         u"610|-|100"_qs}));
+    EXPECT_EQ(file.notes(), QStringList());
+}
+
+TEST(LandXmlStations, IntervalsEndWithTheAlignmentWhateverItsLastDigitsAre)
+{
+    // An end that misses the interval by less than places that are one row.
+    for (const char *end : {"99.99995 0", "100.00005 0", "100 0"}) {
+        LandXmlQuery query = everyTenth();
+        query.atElements = false;
+        for (const bool isRound : {false, true}) {
+            query.fromRound = isRound;
+            const QByteArray line = QByteArray("<Line><Start>0 0</Start><End>") + end + "</End></Line>";
+            EXPECT_EQ(stationsOf(fileOf(alignment(line, "name='road' staStart='0'")), query).size(), 5) << end;
+        }
+    }
+    LandXmlQuery query = everyTenth();
+    query.atElements = false;
+    query.fromRound = true;
+    EXPECT_EQ(stationsOf(fileOf(alignment(straight, "name='road' staStart='25.00005'")), query).value(0), u"25.000"_qs)
+        << "and begin with it";
+}
+
+TEST(LandXmlStations, TheEndOfManyCurvesHasCoordinates)
+{
+    // The sum of the elements' lengths and the sum of their pieces' differ by the last digits.
+    QByteArray elements;
+    const auto at = [](int i) { return QByteArray::number(i * 1e6 + i % 7 * 0.1, 'f', 3) + " 0"; };
+    for (int i = 0; i < 900; ++i) {
+        elements += "<IrregularLine><Start>" + at(i) + "</Start><End>" + at(i + 1) + "</End><PntList2D>" +
+                    QByteArray::number(i * 1e6 + 333333.3, 'f', 3) + " 0.1 " +
+                    QByteArray::number(i * 1e6 + 777777.7, 'f', 3) + " 0.1</PntList2D></IrregularLine>";
+    }
+    LandXmlFile file(fileOf(alignment(elements)), queryOf(Kind::Stations), {QStringLiteral("Northing")});
+    const QStringList rows = file.rows(1);
+    ASSERT_EQ(rows.size(), 901);
+    EXPECT_EQ(rows.back(), u"900000000.4"_qs);
+    EXPECT_FALSE(rows.contains(u"0.0"_qs) && rows.lastIndexOf(u"0.0"_qs) > 0);
+}
+
+TEST(LandXmlStations, OfAnAlignmentAreListedWhateverIsWrongWithOthers)
+{
+    const QByteArray sound = alignment(straight, "name='sound'");
+    const QByteArray wrong[] = {
+        alignment(straight, "name='wrong'", "<StaEquation staInternal='-5' staAhead='1'/>"),
+        alignment("<Line><Start>0 0</Start></Line>", "name='wrong'"),
+        alignment("<Line><Start pntRef='gone'/><End>0 0</End></Line>", "name='wrong'"),
+        alignment(
+            "<Spiral length='65000' rot='cw' spiType='clothoid' radiusStart='INF' radiusEnd='1'><Start>0 0</Start>"
+            "<End>1 1</End></Spiral>",
+            "name='wrong'")
+            .repeated(9),
+    };
+    for (const QByteArray &other : wrong) {
+        for (const Kind kind : {Kind::Stations, Kind::Elements, Kind::Alignments, Kind::Profile, Kind::CrossSections}) {
+            LandXmlFile file(fileOf(other + sound), queryOf(kind, "sound"));
+            file.rows();
+            EXPECT_FALSE(file.list->error())
+                << other.left(120).constData() << textOfError(file.list->error()).toStdString();
+        }
+        LandXmlQuery offsets = queryOf(Kind::OffsetsOf);
+        offsets.alignment = u"sound"_qs;
+        LandXmlFile file(fileOf(other + sound), offsets);
+        file.rows();
+        EXPECT_FALSE(file.list->error()) << other.left(120).constData();
+        LandXmlFile stations(fileOf(other + sound), queryOf(Kind::Stations, "wrong"));
+        stations.rows();
+        EXPECT_TRUE(stations.list->error()) << "asked for itself it is an error: " << other.left(120).constData();
+    }
+}
+
+TEST(LandXmlStations, TheGroundHasGapsBetweenItsPieces)
+{
+    const auto ground = [](const QByteArray &lists) {
+        return fileOf(
+            alignment(straight, "name='road'", {}, "\n<Profile><ProfSurf name='g'>" + lists + "</ProfSurf></Profile>"));
+    };
+    LandXmlQuery query = queryOf(Kind::Stations);
+    query.interval = 20;
+    query.atElements = false;
+    LandXmlFile file(ground("<PntList2D>0 1 20 3 30 3</PntList2D><PntList2D>70 9 80 5 100 5</PntList2D>"), query,
+                     {QStringLiteral("Station"), QStringLiteral("Ground")});
+    EXPECT_EQ(file.rows(0), QStringList({u"0|1"_qs, u"20|3"_qs, u"40|-"_qs, u"60|-"_qs, u"80|5"_qs, u"100|5"_qs}));
+    EXPECT_EQ(file.notes(), QStringList());
+    query.interval = 10;
+    LandXmlFile ends(ground("<PntList2D>0 1 20 3 30 3</PntList2D><PntList2D>70 9 80 5 100 5</PntList2D>"), query,
+                     {QStringLiteral("Ground")});
+    EXPECT_EQ(ends.rows(0).value(3), u"3"_qs) << "the end of a piece";
+    EXPECT_EQ(ends.rows(0).value(7), u"9"_qs) << "the beginning of the next one";
+    LandXmlFile joined(ground("<PntList2D>0 1 20 3</PntList2D><PntList2D>20 3 100 3</PntList2D>"), query,
+                       {QStringLiteral("Ground")});
+    EXPECT_EQ(joined.rows(0).value(1), u"2"_qs);
+    EXPECT_EQ(joined.rows(0).value(5), u"3"_qs) << "pieces that meet have no gap";
+    LandXmlFile unordered(ground("<PntList2D>0 1 30 3 20 3 100 5</PntList2D>"), query, {QStringLiteral("Ground")});
+    EXPECT_EQ(unordered.rows(0).value(1), u"-"_qs);
+    EXPECT_EQ(unordered.notes(),
+              QStringList(u"6:10: the stations of the surface \"g\" do not ascend: no heights are taken from it"_qs));
+}
+
+TEST(LandXmlStations, ALineThatReachesTheCentreOfAnElementIsNoted)
+{
+    LandXmlQuery query = queryOf(Kind::Stations);
+    query.offsets = {{99.9, std::nullopt}, {100, std::nullopt}, {150, std::nullopt}, {-150, std::nullopt}};
+    LandXmlFile file(fileOf(alignment(bend())), query, {QStringLiteral("Station")});
+    EXPECT_EQ(file.rows().size(), 4);
+    EXPECT_EQ(file.notes(),
+              QStringList({u"6:1: the line at the offset 100.000 reaches the centre of the element, whose radius is "
+                           "100.000, and turns back there"_qs,
+                           u"6:1: the line at the offset 150.000 reaches the centre of the element, whose radius is "
+                           "100.000, and turns back there"_qs}))
+        << "on the inner side alone";
+    const PlaneCurve left = curve(TransitionForm::Clothoid, {0, 0}, 0, 60, 0, -1 / 50.0);
+    query.offsets = {{-60, std::nullopt}, {60, std::nullopt}};
+    LandXmlFile spirals(fileOf(alignment(spiral(left, "clothoid"))), query, {QStringLiteral("Station")});
+    spirals.rows();
+    ASSERT_EQ(spirals.notes().size(), 1);
+    EXPECT_TRUE(spirals.notes().front().contains(u"offset -60.000")) << spirals.notes().front().toStdString();
+}
+
 } // namespace

@@ -4,6 +4,7 @@
 
 #include <gtest/gtest.h>
 
+#include <ctime>
 #include <stdexcept>
 
 namespace
@@ -59,8 +60,8 @@ TEST(XmlStream, TellsElementsAttributesAndTexts)
 {
     const Read read("<a x='1' y=\"&lt;\">t&#65;<b/>u<skip z='2'><c>v</c></skip><parts>gone<d>w</d></parts></a>");
     EXPECT_FALSE(read.error);
-    EXPECT_EQ(read.listener.heard, "<a x=1 y=<>tA<b></><skip z=2><parts><d>w</></></>")
-        << "text after an element in it is not asked for by anybody, and is not told";
+    EXPECT_EQ(read.listener.heard, "<a x=1 y=<>tA<b></>u<skip z=2><parts><d>w</></></>")
+        << "what is in \"skip\", and the text in \"parts\", are not asked for";
 }
 
 TEST(XmlStream, TheVocabularyIsThatOfTheOutermostElementWhateverItsPrefixIs)
@@ -129,18 +130,20 @@ TEST(XmlStream, EveryMistakeHasItsPlace)
         const char *reason;
     };
     constexpr Row rows[] = {
-        {"", "1:1", "no well-formed XML", "an empty file"},
-        {"northing,easting\n1,2\n", "1:1", "no well-formed XML", "a file of another kind"},
-        {"<a>\n <b>\n </c></a>", "3:4", "no well-formed XML", "an end that does not match"},
-        {"<a>\n<b>", "2:4", "no well-formed XML", "cut off"},
-        {"<a>\n\xC3\xA4<b x=1/></a>", "2:7", "no well-formed XML", "columns count characters"},
-        {"<a>\n\xFF</a>", "2:1", "no well-formed XML", "not UTF-8"},
+        {"", "1:1", "not well-formed XML", "an empty file"},
+        {"northing,easting\n1,2\n", "1:1", "not well-formed XML", "a file of another kind"},
+        {"<a>\n <b>\n </c></a>", "3:4", "not well-formed XML", "an end that does not match"},
+        {"<a>\n<b>", "2:4", "not well-formed XML", "cut off"},
+        {"<a>\n\xC3\xA4<b x=1/></a>", "2:7", "not well-formed XML", "columns count characters"},
+        {"<a>\n\xFF</a>", "2:1", "not well-formed XML", "not UTF-8"},
         {"<?xml version='1.0' encoding='Shift_JIS'?><a/>", "1:31", "encoding", "an encoding that is not known"},
         {"<!DOCTYPE a [\n<!ENTITY x 'y'>]><a>&x;</a>", "2:12", "\"x\"", "an entity: its declaration has ended"},
         {"<!DOCTYPE a [<!ENTITY x SYSTEM 'file:///etc/passwd'>]>\n<a>&x;</a>", "1:52", "\"x\"", "one of another file"},
         {"<!DOCTYPE a [<!ENTITY % x SYSTEM 'file:///etc/passwd'>]>\n<a/>", "1:54", "\"x\"", "one of the declaration"},
-        {"<!DOCTYPE a SYSTEM 'other.dtd'>\n<a>&x;</a>", "2:4", "\"x\"", "one that another file would declare"},
-        {"<a>\n&x;</a>", "2:1", "no well-formed XML", "one that nobody declares"},
+        {"<!DOCTYPE a SYSTEM 'other.dtd'>\n<a>&x;</a>", "1:31", "\"other.dtd\"", "one that another file would declare"},
+        {"<!DOCTYPE a PUBLIC 'x' 'other.dtd' [\n<!ATTLIST a b CDATA '1'>]><a/>", "1:36", "\"other.dtd\"",
+         "a document type in another file, and more of it in this one"},
+        {"<a>\n&x;</a>", "2:1", "not well-formed XML", "one that nobody declares"},
     };
     for (const Row &row : rows) {
         const Read read(row.content);
@@ -203,6 +206,34 @@ TEST(XmlStream, TextsAreToldInPiecesOfAnySize)
 TEST(XmlStream, WhatTheHandlerThrowsIsThrownOn)
 {
     EXPECT_THROW(Read("<a><throw/></a>"), std::runtime_error);
+}
+
+TEST(XmlStream, TextAfterAnElementBelongsToTheOneAroundIt)
+{
+    EXPECT_EQ(Read("<a>1<b>2<skip>3</skip>4<parts>5<c>6</c>7</parts>8</b>9</a>").listener.heard,
+              "<a>1<b>2<skip>4<parts><c>6</></>8</>9</>");
+    EXPECT_EQ(Read("<a xmlns='u'>1<x xmlns='v'>2</x>3</a>").listener.heard, "<a>1{x}3</>");
+}
+
+TEST(XmlStream, ADocumentTypeInTheFileItselfIsRead)
+{
+    const Read read("<!DOCTYPE a [<!ELEMENT a ANY>]><a>1</a>");
+    EXPECT_FALSE(read.error);
+    EXPECT_EQ(read.listener.heard, "<a>1</>");
+}
+
+TEST(XmlStream, ManyPrefixesTakeNoMoreTimeThanTheirBytes)
+{
+    QByteArray content = "<a xmlns='u'";
+    for (int i = 0; i < 100000; ++i) {
+        content += " xmlns:p" + QByteArray::number(i) + "='v'";
+    }
+    content += '>' + QByteArray("<b/><p7:c/>").repeated(100000) + "</a>";
+    const std::clock_t begin = std::clock();
+    const Read read(content);
+    EXPECT_LT((std::clock() - begin) / CLOCKS_PER_SEC, 5);
+    EXPECT_FALSE(read.error);
+    EXPECT_EQ(read.listener.heard, "<a>" + QByteArray("<b></>{p7:c}").repeated(100000).toStdString() + "</>");
 }
 
 } // namespace

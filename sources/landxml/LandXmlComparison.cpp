@@ -1,0 +1,112 @@
+#include "LandXmlComparison.h"
+
+#include "Xlate.h"
+
+#include <algorithm>
+#include <cmath>
+#include <iterator>
+
+namespace kareport
+{
+
+namespace
+{
+
+/// The ways in which directions are measured. Each turns a direction into a bearing, and a bearing into a direction.
+constexpr double (*readings[])(double) = {
+    [](double angle) { return angle; },                        // clockwise from north
+    [](double angle) { return -angle; },                       // counterclockwise from north
+    [](double angle) { return std::numbers::pi / 2 - angle; }, // counterclockwise from east
+};
+
+} // namespace
+
+void LandXmlComparison::note(std::size_t byte, const char *what, const QString &stated, const QString &computed)
+{
+    notes_.add(byte,
+               Xlate("%1 is %2 in the file, but %3 by its geometry").arg(QString::fromUtf8(what), stated, computed));
+}
+
+QString LandXmlComparison::lengthText(double metres) const
+{
+    return QString::number(metres / units_.metres, 'f', 4);
+}
+
+void LandXmlComparison::length(std::size_t byte, const char *what, double stated, double computed)
+{
+    if (!std::isnan(stated) && !(std::fabs(stated - computed) <= tolerance_.length)) {
+        note(byte, what, lengthText(stated), lengthText(computed));
+    }
+}
+
+void LandXmlComparison::area(std::size_t byte, const char *what, double stated, double computed)
+{
+    const double allowed = std::max(0.1, 0.001 * stated) * (tolerance_.length / LandXmlTolerance().length);
+    if (!std::isnan(stated) && !(std::fabs(stated - computed) <= allowed)) {
+        note(byte, what, QString::number(stated / units_.squareMetres, 'f', 4),
+             QString::number(computed / units_.squareMetres, 'f', 4));
+    }
+}
+
+void LandXmlComparison::direction(std::size_t byte, const char *what, double stated, double bearing)
+{
+    if (!std::isnan(stated)) {
+        directions_.push_back({byte, what, stated, bearing});
+    }
+}
+
+void LandXmlComparison::noteDirections()
+{
+    const auto fits = [this](const Direction &direction, double (*reading)(double)) {
+        return std::fabs(turnBetween(reading(direction.stated), direction.bearing)) <= tolerance_.angle;
+    };
+    std::ptrdiff_t most = -1;
+    double (*best)(double) = nullptr;
+    for (const auto reading : readings) {
+        const auto count = std::count_if(directions_.begin(), directions_.end(),
+                                         [&](const Direction &direction) { return fits(direction, reading); });
+        if (count > most) {
+            most = count;
+            best = reading;
+        }
+    }
+    for (const Direction &direction : directions_) {
+        if (!fits(direction, best)) {
+            note(direction.byte, direction.what,
+                 landXmlAngleText(normalizedBearing(direction.stated), units_.direction),
+                 landXmlAngleText(normalizedBearing(best(direction.bearing)), units_.direction));
+        }
+    }
+    directions_.clear();
+}
+
+void LandXmlComparison::end(std::size_t byte, PlanePoint stated, PlanePoint computed)
+{
+    if (!(distanceBetween(stated, computed) <= tolerance_.length)) {
+        const auto text = [this](PlanePoint point) {
+            return lengthText(point.northing) + u' ' + lengthText(point.easting);
+        };
+        note(byte, "End", text(stated), text(computed));
+    }
+}
+
+void LandXmlComparison::gap(std::size_t byte, double width)
+{
+    if (!(width <= tolerance_.length)) {
+        notes_.add(byte, Xlate("the element begins %1 from the end of the element before").arg(lengthText(width)));
+    }
+}
+
+void LandXmlComparison::intersection(std::size_t byte, PlanePoint stated, const PlaneCurve &curve)
+{
+    const double start = seenFrom(curve.start(), stated).easting;
+    const double end = seenFrom(curve.end(), stated).easting;
+    const double off = std::max(std::fabs(start), std::fabs(end));
+    if (!(off <= tolerance_.length)) {
+        notes_.add(byte,
+                   Xlate("%1 is %2 beside the tangents of the element: perhaps the element bends to the other side")
+                       .arg(QStringLiteral("PI"), lengthText(off)));
+    }
+}
+
+} // namespace kareport

@@ -1,0 +1,26 @@
+#pragma once
+
+#include "LandXmlModel.h"
+#include "LandXmlNotes.h"
+#include "LandXmlPointTable.h"
+
+#include <vector>
+
+namespace kareport
+{
+
+/// Whether coordinates have to be looked up among the points of the file.
+bool isReference(const LandXmlCoordinates &at);
+/// Whether any coordinates of elements have.
+bool hasReferences(const std::vector<LandXmlElement> &elements);
+
+/// Gives coordinates the position, the height and the name of the point that they refer to. They stay without a position where
+/// there is no such point. @param notes  is told of names that several points have
+void resolve(LandXmlCoordinates &at, const LandXmlPointTable &points, LandXmlNotes &notes);
+/// The same for all coordinates of elements.
+void resolve(std::vector<LandXmlElement> &elements, const LandXmlPointTable &points, LandXmlNotes &notes);
+
+/// Says that several points have a name that is referred to. @param byte  of the reference
+void noteAmbiguous(const std::string &name, std::size_t byte, LandXmlNotes &notes);
+
+} // namespace kareport
