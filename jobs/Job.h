@@ -125,8 +125,9 @@ struct TemplateJob
     QString templateName;
     QString table; ///< or a block
     QString block;
-    QString data;                 ///< a CSV file, "-" for standard input
-    QJsonObject dataOptions = {}; ///< what else the data set says, such as its delimiter
+    QString data;                             ///< a file, "-" for standard input
+    QJsonObject dataOptions = {};             ///< what else the data set says, such as its delimiter
+    QString dataKind = QStringLiteral("csv"); ///< the key of the kind of data that the file holds
 
     /// The content of the equivalent job file.
     QJsonObject toJson() const;

@@ -230,7 +230,7 @@ QJsonObject TemplateJob::toJson() const
     const QJsonObject step = {{isTable ? QStringLiteral("table") : QStringLiteral("block"), isTable ? table : block},
                               {set, set}};
     QJsonObject dataSet = dataOptions;
-    dataSet.insert(QStringLiteral("csv"), data);
+    dataSet.insert(dataKind, data);
     return {
         {QStringLiteral("template"),
          QJsonObject{{QStringLiteral("file"), templateFile}, {QStringLiteral("name"), templateName}}},

@@ -1212,14 +1212,19 @@
         <translation>keine</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/AlignmentRows.cpp"/>
-        <source>high point</source>
-        <translation>Hochpunkt</translation>
+        <location filename="../sources/landxml/LandXmlComparison.cpp"/>
+        <source>%1 is %2 in the file, but %3 by its geometry</source>
+        <translation>%1 ist in der Datei %2, nach der Geometrie aber %3</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/AlignmentRows.cpp"/>
-        <source>low point</source>
-        <translation>Tiefpunkt</translation>
+        <location filename="../sources/landxml/LandXmlComparison.cpp"/>
+        <source>the element begins %1 from the end of the element before</source>
+        <translation>das Element beginnt %1 vom Ende des vorigen Elements entfernt</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlComparison.cpp"/>
+        <source>%1 is %2 beside the tangents of the element: perhaps the element bends to the other side</source>
+        <translation>%1 liegt %2 neben den Tangenten des Elements: vielleicht biegt das Element zur anderen Seite</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
@@ -1258,11 +1263,6 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>not supported: an element "%1" of an alignment or a border</source>
-        <translation>nicht unterstützt: ein Element „%1“ einer Achse oder einer Grenze</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
         <source>the element has no geometry: its radius does not reach from its start to its end</source>
         <translation>das Element hat keine Geometrie: sein Halbmesser reicht nicht vom Anfang zum Ende</translation>
     </message>
@@ -1273,38 +1273,8 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>%1 is %2 in the file, but %3 by its geometry</source>
-        <translation>%1 ist in der Datei %2, nach der Geometrie aber %3</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>%1 is %2 beside the tangents of the element: perhaps the element bends to the other side</source>
-        <translation>%1 liegt %2 neben den Tangenten des Elements: vielleicht biegt das Element zur anderen Seite</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the grade line has fewer than two points</source>
-        <translation>die Gradiente hat weniger als zwei Punkte</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the grade line has no heights: a length or a radius above zero was expected</source>
-        <translation>die Gradiente hat keine Höhen: eine Länge oder ein Halbmesser über null wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the grade line has no heights: a station ahead of that of the point before was expected</source>
-        <translation>die Gradiente hat keine Höhen: eine Station hinter der des vorigen Punkts wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the first or the last point of the grade line has a curve, where only one grade meets</source>
-        <translation>der erste oder letzte Punkt der Gradiente hat eine Ausrundung, wo nur eine Neigung ist</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the vertical curve begins before the curve of the point before has ended</source>
-        <translation>die Ausrundung beginnt, bevor die des vorigen Punkts zu Ende ist</translation>
+        <source>not supported: an element "%1" of an alignment or a border</source>
+        <translation>nicht unterstützt: ein Element „%1“ einer Achse oder einer Grenze</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlList.cpp"/>
@@ -1342,9 +1312,39 @@
         <translation>Elemente anderer Arten: %1 in der Datei, die keine Liste liest</translation>
     </message>
     <message>
+        <location filename="../sources/landxml/LandXmlProfile.cpp"/>
+        <source>the grade line has fewer than two points</source>
+        <translation>die Gradiente hat weniger als zwei Punkte</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlProfile.cpp"/>
+        <source>the grade line has no heights: a length or a radius above zero was expected</source>
+        <translation>die Gradiente hat keine Höhen: eine Länge oder ein Halbmesser über null wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlProfile.cpp"/>
+        <source>the grade line has no heights: a station ahead of that of the point before was expected</source>
+        <translation>die Gradiente hat keine Höhen: eine Station hinter der des vorigen Punkts wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlProfile.cpp"/>
+        <source>the first or the last point of the grade line has a curve, where only one grade meets</source>
+        <translation>der erste oder letzte Punkt der Gradiente hat eine Ausrundung, wo nur eine Neigung ist</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlProfile.cpp"/>
+        <source>the vertical curve begins before the curve of the point before has ended</source>
+        <translation>die Ausrundung beginnt, bevor die des vorigen Punkts zu Ende ist</translation>
+    </message>
+    <message>
         <location filename="../sources/landxml/LandXmlReader.cpp"/>
         <source>the element holds more than %1 bytes of text</source>
         <translation>das Element enthält mehr als %1 Byte Text</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReader.cpp"/>
+        <source>the file has too many elements without content</source>
+        <translation>die Datei hat zu viele Elemente ohne Inhalt</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlReaderAttributes.cpp"/>
@@ -1373,8 +1373,8 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlReaderText.cpp"/>
-        <source>signs stand apart from their numbers, to which they were taken to belong</source>
-        <translation>Vorzeichen stehen getrennt von ihren Zahlen, denen sie zugeordnet wurden</translation>
+        <source>signs are separated from their numbers by blanks, and were taken with them</source>
+        <translation>Vorzeichen sind durch Leerzeichen von ihren Zahlen getrennt und wurden zu ihnen genommen</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlReaderText.cpp"/>
@@ -1388,13 +1388,18 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlReaderText.cpp"/>
-        <source>the list of numbers ends within a point, which is passed over</source>
-        <translation>die Zahlenliste endet mitten in einem Punkt, der übergangen wird</translation>
+        <source>the list of numbers ends in the middle of a point, which was left out</source>
+        <translation>die Zahlenliste endet mitten in einem Punkt, der weggelassen wurde</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReferences.cpp"/>
+        <source>several points have the name "%1" that is referred to: the first one was taken</source>
+        <translation>mehrere Punkte haben den Namen „%1“, auf den verwiesen wird: der erste wurde genommen</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlRoute.cpp"/>
-        <source>the element has no length and is passed over</source>
-        <translation>das Element hat keine Länge und wird übergangen</translation>
+        <source>the element has no length and was left out</source>
+        <translation>das Element hat keine Länge und wurde weggelassen</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlRoute.cpp"/>
@@ -1403,13 +1408,18 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlRoute.cpp"/>
-        <source>the station equation is not ahead of the start and of the equations before it, or has no numbers: staInternal or staBack, and staAhead were expected</source>
-        <translation>die Stationsgleichung liegt nicht hinter dem Anfang und den Gleichungen davor, oder ihr fehlen Zahlen: staInternal oder staBack, und staAhead wurden erwartet</translation>
+        <source>the station equation is before the start or not ahead of the equation before it, or has no numbers: staInternal or staBack, and staAhead were expected</source>
+        <translation>die Stationsgleichung liegt vor dem Anfang oder nicht hinter der vorigen Gleichung, oder ihr fehlen Zahlen: staInternal oder staBack, und staAhead wurden erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRoute.cpp"/>
+        <source>the stations of the surface "%1" do not ascend: no heights are taken from it</source>
+        <translation>die Stationen der Oberfläche „%1“ steigen nicht an: ihr werden keine Höhen entnommen</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlRows.cpp"/>
-        <source>the file is of version %1: what is read are versions 1.0 to 2.0</source>
-        <translation>die Datei ist von Version %1: gelesen werden die Versionen 1.0 bis 2.0</translation>
+        <source>the file is of version %1: versions 1.0 to 2.0 are known</source>
+        <translation>die Datei ist von Version %1: bekannt sind die Versionen 1.0 bis 2.0</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlRows.cpp"/>
@@ -1433,48 +1443,73 @@
     </message>
     <message>
         <location filename="../sources/landxml/ParcelRows.cpp"/>
-        <source>the border of the parcel does not close: %1 metres are open</source>
-        <translation>die Grenze des Flurstücks schließt sich nicht: %1 Meter sind offen</translation>
+        <source>the border of the parcel does not close: there is a gap of %1 metres</source>
+        <translation>die Grenze des Flurstücks schließt sich nicht: es bleibt eine Lücke von %1 Metern</translation>
     </message>
     <message>
         <location filename="../sources/landxml/PointRows.cpp"/>
-        <source>the name "%1" stands for several points</source>
-        <translation>der Name „%1“ steht für mehrere Punkte</translation>
+        <source>several points have the name "%1"</source>
+        <translation>mehrere Punkte haben den Namen „%1“</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/PointRows.cpp"/>
+        <location filename="../sources/landxml/ProfileRows.cpp"/>
+        <source>high point</source>
+        <translation>Hochpunkt</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/ProfileRows.cpp"/>
+        <source>low point</source>
+        <translation>Tiefpunkt</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/ProjectedRows.cpp"/>
         <source>the file has several alignments: the name of one was expected</source>
         <translation>die Datei hat mehrere Achsen: der Name von einer wurde erwartet</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/PointRows.cpp"/>
+        <location filename="../sources/landxml/ProjectedRows.cpp"/>
         <source>the file has no alignment</source>
         <translation>die Datei hat keine Achse</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/PointRows.cpp"/>
+        <location filename="../sources/landxml/ProjectedRows.cpp"/>
         <source>the alignment has no elements</source>
         <translation>die Achse hat keine Elemente</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/PointRows.cpp"/>
+        <location filename="../sources/landxml/ProjectedRows.cpp"/>
+        <source>too far away</source>
+        <translation>zu weit entfernt</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/ProjectedRows.cpp"/>
         <source>outside of a corner</source>
         <translation>außen an einem Knick</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/PointRows.cpp"/>
+        <location filename="../sources/landxml/ProjectedRows.cpp"/>
         <source>before the start</source>
         <translation>vor dem Anfang</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/PointRows.cpp"/>
+        <location filename="../sources/landxml/ProjectedRows.cpp"/>
         <source>after the end</source>
         <translation>hinter dem Ende</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/PointRows.cpp"/>
+        <location filename="../sources/landxml/ProjectedRows.cpp"/>
         <source>at a centre</source>
         <translation>an einem Mittelpunkt</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/StationPlaces.cpp"/>
+        <source>the alignment has no station %1</source>
+        <translation>die Achse hat keine Station %1</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/StationPlaces.cpp"/>
+        <source>the alignment has the station %1 at several places</source>
+        <translation>die Achse hat die Station %1 an mehreren Stellen</translation>
     </message>
     <message>
         <location filename="../sources/landxml/StationRows.cpp"/>
@@ -1483,13 +1518,13 @@
     </message>
     <message>
         <location filename="../sources/landxml/StationRows.cpp"/>
-        <source>the alignment has no station %1</source>
-        <translation>die Achse hat keine Station %1</translation>
+        <source>the line at the offset %1 reaches the centre of the element, whose radius is %2, and turns back there</source>
+        <translation>die Linie im Abstand %1 erreicht den Mittelpunkt des Elements mit dem Halbmesser %2 und kehrt dort um</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/StationRows.cpp"/>
-        <source>the alignment has the station %1 at several places</source>
-        <translation>die Achse hat die Station %1 an mehreren Stellen</translation>
+        <location filename="../sources/landxml/XmlStream.cpp"/>
+        <source>the document type is in another file, "%1", which is not read: a file that needs no other was expected</source>
+        <translation>der Dokumenttyp steht in einer anderen Datei, „%1“, die nicht gelesen wird: erwartet wurde eine Datei, die keine andere braucht</translation>
     </message>
     <message>
         <location filename="../sources/landxml/XmlStream.cpp"/>
@@ -1508,7 +1543,7 @@
     </message>
     <message>
         <location filename="../sources/landxml/XmlStream.cpp"/>
-        <source>the file is no well-formed XML: %1</source>
+        <source>the file is not well-formed XML: %1</source>
         <translation>die Datei ist kein wohlgeformtes XML: %1</translation>
     </message>
     <message>
@@ -2565,6 +2600,136 @@ Sollen sie wieder geöffnet werden?</translation>
         <translation>Was davon aufbewahrt wurde, ist nicht mehr vorhanden</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Points</source>
+        <translation>Punkte</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Points of surfaces</source>
+        <translation>Punkte von Oberflächen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Parcels</source>
+        <translation>Flurstücke</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Sides of parcels</source>
+        <translation>Seiten von Flurstücken</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Alignments</source>
+        <translation>Achsen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Elements of alignments</source>
+        <translation>Elemente von Achsen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Stations</source>
+        <translation>Stationen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Profile</source>
+        <translation>Längsschnitt</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Cross sections</source>
+        <translation>Querprofile</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Points beside an alignment</source>
+        <translation>Punkte neben einer Achse</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>&amp;List:</source>
+        <translation>&amp;Liste:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>List</source>
+        <translation>Liste</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>&amp;Group:</source>
+        <translation>&amp;Gruppe:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Group</source>
+        <translation>Gruppe</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>&amp;Parcel:</source>
+        <translation>&amp;Flurstück:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Parcel</source>
+        <translation>Flurstück</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>&amp;Alignment:</source>
+        <translation>&amp;Achse:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Alignment</source>
+        <translation>Achse</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Grade li&amp;ne:</source>
+        <translation>G&amp;radiente:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Grade line</source>
+        <translation>Gradiente</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>S&amp;urface:</source>
+        <translation>&amp;Oberfläche:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Surface</source>
+        <translation>Oberfläche</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>&amp;Interval:</source>
+        <translation>&amp;Intervall:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Interval</source>
+        <translation>Intervall</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>The distance of regular stations, in the unit of the file</source>
+        <translation>Der Abstand regelmäßiger Stationen, in der Einheit der Datei</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>(all)</source>
+        <translation>(alle)</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Preferences</source>
         <translation>Einstellungen</translation>
@@ -2725,8 +2890,8 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
-        <source>&amp;Data (CSV):</source>
-        <translation>Date&amp;n (CSV):</translation>
+        <source>&amp;Data:</source>
+        <translation>Date&amp;n:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
@@ -2735,8 +2900,18 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
-        <source>Data (*.csv *.txt);;All files (*)</source>
-        <translation>Daten (*.csv *.txt);;Alle Dateien (*)</translation>
+        <source>Data (*.csv *.txt *.xml *.landxml);;All files (*)</source>
+        <translation>Daten (*.csv *.txt *.xml *.landxml);;Alle Dateien (*)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>The data file was not read to its end.</source>
+        <translation>Die Datendatei wurde nicht zu Ende gelesen.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>The data file holds nothing that is listed.</source>
+        <translation>Die Datendatei enthält nichts, was aufgelistet wird.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>

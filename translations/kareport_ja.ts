@@ -1212,14 +1212,19 @@
         <translation>なし</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/AlignmentRows.cpp"/>
-        <source>high point</source>
-        <translation>最高点</translation>
+        <location filename="../sources/landxml/LandXmlComparison.cpp"/>
+        <source>%1 is %2 in the file, but %3 by its geometry</source>
+        <translation>%1 はファイルでは %2 ですが、形状からは %3 です</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/AlignmentRows.cpp"/>
-        <source>low point</source>
-        <translation>最低点</translation>
+        <location filename="../sources/landxml/LandXmlComparison.cpp"/>
+        <source>the element begins %1 from the end of the element before</source>
+        <translation>要素の始点が前の要素の終点から %1 離れています</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlComparison.cpp"/>
+        <source>%1 is %2 beside the tangents of the element: perhaps the element bends to the other side</source>
+        <translation>%1 は要素の接線から %2 離れています: 要素は反対側に曲がっている可能性があります</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
@@ -1258,11 +1263,6 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>not supported: an element "%1" of an alignment or a border</source>
-        <translation>未対応：線形または境界の要素「%1」</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
         <source>the element has no geometry: its radius does not reach from its start to its end</source>
         <translation>要素の形状を求められません: 半径が始点から終点まで届きません</translation>
     </message>
@@ -1273,38 +1273,8 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>%1 is %2 in the file, but %3 by its geometry</source>
-        <translation>%1 はファイルでは %2 ですが、形状からは %3 です</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>%1 is %2 beside the tangents of the element: perhaps the element bends to the other side</source>
-        <translation>%1 は要素の接線から %2 離れています: 要素は反対側に曲がっている可能性があります</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the grade line has fewer than two points</source>
-        <translation>計画縦断線の点が 2 点未満です</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the grade line has no heights: a length or a radius above zero was expected</source>
-        <translation>計画縦断線の高さを求められません: 0 より大きい長さか半径が必要です</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the grade line has no heights: a station ahead of that of the point before was expected</source>
-        <translation>計画縦断線の高さを求められません: 測点は前の点より先である必要があります</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the first or the last point of the grade line has a curve, where only one grade meets</source>
-        <translation>計画縦断線の最初か最後の点に縦断曲線がありますが、そこには勾配が一つしかありません</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the vertical curve begins before the curve of the point before has ended</source>
-        <translation>縦断曲線が前の点の曲線の終わりより手前で始まっています</translation>
+        <source>not supported: an element "%1" of an alignment or a border</source>
+        <translation>未対応：線形または境界の要素「%1」</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlList.cpp"/>
@@ -1342,9 +1312,39 @@
         <translation>その他の種類の要素: ファイルに %1 個ありますが、どの一覧も読みません</translation>
     </message>
     <message>
+        <location filename="../sources/landxml/LandXmlProfile.cpp"/>
+        <source>the grade line has fewer than two points</source>
+        <translation>計画縦断線の点が 2 点未満です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlProfile.cpp"/>
+        <source>the grade line has no heights: a length or a radius above zero was expected</source>
+        <translation>計画縦断線の高さを求められません: 0 より大きい長さか半径が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlProfile.cpp"/>
+        <source>the grade line has no heights: a station ahead of that of the point before was expected</source>
+        <translation>計画縦断線の高さを求められません: 測点は前の点より先である必要があります</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlProfile.cpp"/>
+        <source>the first or the last point of the grade line has a curve, where only one grade meets</source>
+        <translation>計画縦断線の最初か最後の点に縦断曲線がありますが、そこには勾配が一つしかありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlProfile.cpp"/>
+        <source>the vertical curve begins before the curve of the point before has ended</source>
+        <translation>縦断曲線が前の点の曲線の終わりより手前で始まっています</translation>
+    </message>
+    <message>
         <location filename="../sources/landxml/LandXmlReader.cpp"/>
         <source>the element holds more than %1 bytes of text</source>
         <translation>要素のテキストが %1 バイトを超えています</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReader.cpp"/>
+        <source>the file has too many elements without content</source>
+        <translation>内容のない要素が多すぎます</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlReaderAttributes.cpp"/>
@@ -1373,8 +1373,8 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlReaderText.cpp"/>
-        <source>signs stand apart from their numbers, to which they were taken to belong</source>
-        <translation>符号が数値から離れています。続く数値の符号とみなしました</translation>
+        <source>signs are separated from their numbers by blanks, and were taken with them</source>
+        <translation>符号と数値の間に空白があります。続く数値の符号とみなしました</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlReaderText.cpp"/>
@@ -1388,13 +1388,18 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlReaderText.cpp"/>
-        <source>the list of numbers ends within a point, which is passed over</source>
-        <translation>数値の並びが点の途中で終わっています。この点は読み飛ばします</translation>
+        <source>the list of numbers ends in the middle of a point, which was left out</source>
+        <translation>数値の並びが点の途中で終わっています。この点は除きました</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReferences.cpp"/>
+        <source>several points have the name "%1" that is referred to: the first one was taken</source>
+        <translation>参照先の名前「%1」の点が複数あります: 最初の点を使いました</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlRoute.cpp"/>
-        <source>the element has no length and is passed over</source>
-        <translation>要素に長さがないため読み飛ばします</translation>
+        <source>the element has no length and was left out</source>
+        <translation>要素に長さがないため除きました</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlRoute.cpp"/>
@@ -1403,13 +1408,18 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlRoute.cpp"/>
-        <source>the station equation is not ahead of the start and of the equations before it, or has no numbers: staInternal or staBack, and staAhead were expected</source>
-        <translation>測点のブレーキが始点や前のブレーキより先にないか、数値がありません: staInternal または staBack と、staAhead が必要です</translation>
+        <source>the station equation is before the start or not ahead of the equation before it, or has no numbers: staInternal or staBack, and staAhead were expected</source>
+        <translation>測点のブレーキが始点より手前か、前のブレーキより先にないか、数値がありません: staInternal または staBack と、staAhead が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRoute.cpp"/>
+        <source>the stations of the surface "%1" do not ascend: no heights are taken from it</source>
+        <translation>サーフェス「%1」の測点が昇順ではありません: この高さは使いません</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlRows.cpp"/>
-        <source>the file is of version %1: what is read are versions 1.0 to 2.0</source>
-        <translation>ファイルはバージョン %1 です: 読み取れるのはバージョン 1.0 から 2.0 です</translation>
+        <source>the file is of version %1: versions 1.0 to 2.0 are known</source>
+        <translation>ファイルはバージョン %1 です: 対応しているのはバージョン 1.0 から 2.0 です</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlRows.cpp"/>
@@ -1433,48 +1443,73 @@
     </message>
     <message>
         <location filename="../sources/landxml/ParcelRows.cpp"/>
-        <source>the border of the parcel does not close: %1 metres are open</source>
-        <translation>区画の境界が閉じていません: %1 メートル開いています</translation>
+        <source>the border of the parcel does not close: there is a gap of %1 metres</source>
+        <translation>区画の境界が閉じていません: %1 メートルの隙間があります</translation>
     </message>
     <message>
         <location filename="../sources/landxml/PointRows.cpp"/>
-        <source>the name "%1" stands for several points</source>
+        <source>several points have the name "%1"</source>
         <translation>名前「%1」の点が複数あります</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/PointRows.cpp"/>
+        <location filename="../sources/landxml/ProfileRows.cpp"/>
+        <source>high point</source>
+        <translation>最高点</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/ProfileRows.cpp"/>
+        <source>low point</source>
+        <translation>最低点</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/ProjectedRows.cpp"/>
         <source>the file has several alignments: the name of one was expected</source>
         <translation>ファイルに線形が複数あります: いずれかの名前が必要です</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/PointRows.cpp"/>
+        <location filename="../sources/landxml/ProjectedRows.cpp"/>
         <source>the file has no alignment</source>
         <translation>ファイルに線形がありません</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/PointRows.cpp"/>
+        <location filename="../sources/landxml/ProjectedRows.cpp"/>
         <source>the alignment has no elements</source>
         <translation>線形に要素がありません</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/PointRows.cpp"/>
+        <location filename="../sources/landxml/ProjectedRows.cpp"/>
+        <source>too far away</source>
+        <translation>遠すぎます</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/ProjectedRows.cpp"/>
         <source>outside of a corner</source>
         <translation>折れ点の外側</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/PointRows.cpp"/>
+        <location filename="../sources/landxml/ProjectedRows.cpp"/>
         <source>before the start</source>
         <translation>始点より手前</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/PointRows.cpp"/>
+        <location filename="../sources/landxml/ProjectedRows.cpp"/>
         <source>after the end</source>
         <translation>終点より先</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/PointRows.cpp"/>
+        <location filename="../sources/landxml/ProjectedRows.cpp"/>
         <source>at a centre</source>
         <translation>中心点</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/StationPlaces.cpp"/>
+        <source>the alignment has no station %1</source>
+        <translation>線形に測点 %1 がありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/StationPlaces.cpp"/>
+        <source>the alignment has the station %1 at several places</source>
+        <translation>線形の複数の箇所に測点 %1 があります</translation>
     </message>
     <message>
         <location filename="../sources/landxml/StationRows.cpp"/>
@@ -1483,13 +1518,13 @@
     </message>
     <message>
         <location filename="../sources/landxml/StationRows.cpp"/>
-        <source>the alignment has no station %1</source>
-        <translation>線形に測点 %1 がありません</translation>
+        <source>the line at the offset %1 reaches the centre of the element, whose radius is %2, and turns back there</source>
+        <translation>オフセット %1 の線は半径 %2 の要素の中心に達し、そこで折り返します</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/StationRows.cpp"/>
-        <source>the alignment has the station %1 at several places</source>
-        <translation>線形の複数の箇所に測点 %1 があります</translation>
+        <location filename="../sources/landxml/XmlStream.cpp"/>
+        <source>the document type is in another file, "%1", which is not read: a file that needs no other was expected</source>
+        <translation>文書型が別のファイル「%1」にあり、これは読み込みません: 他のファイルを必要としないファイルが必要です</translation>
     </message>
     <message>
         <location filename="../sources/landxml/XmlStream.cpp"/>
@@ -1508,7 +1543,7 @@
     </message>
     <message>
         <location filename="../sources/landxml/XmlStream.cpp"/>
-        <source>the file is no well-formed XML: %1</source>
+        <source>the file is not well-formed XML: %1</source>
         <translation>ファイルは整形式の XML ではありません: %1</translation>
     </message>
     <message>
@@ -2565,6 +2600,136 @@ Open them again?</source>
         <translation>保管されていた内容が見つかりません</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Points</source>
+        <translation>点</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Points of surfaces</source>
+        <translation>サーフェスの点</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Parcels</source>
+        <translation>区画</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Sides of parcels</source>
+        <translation>区画の辺</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Alignments</source>
+        <translation>線形</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Elements of alignments</source>
+        <translation>線形の要素</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Stations</source>
+        <translation>測点</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Profile</source>
+        <translation>縦断</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Cross sections</source>
+        <translation>横断</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Points beside an alignment</source>
+        <translation>線形に対する点</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>&amp;List:</source>
+        <translation>一覧(&amp;L):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>List</source>
+        <translation>一覧</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>&amp;Group:</source>
+        <translation>グループ(&amp;G):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Group</source>
+        <translation>グループ</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>&amp;Parcel:</source>
+        <translation>区画(&amp;P):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Parcel</source>
+        <translation>区画</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>&amp;Alignment:</source>
+        <translation>線形(&amp;A):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Alignment</source>
+        <translation>線形</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Grade li&amp;ne:</source>
+        <translation>計画縦断線(&amp;N):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Grade line</source>
+        <translation>計画縦断線</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>S&amp;urface:</source>
+        <translation>サーフェス(&amp;U):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Surface</source>
+        <translation>サーフェス</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>&amp;Interval:</source>
+        <translation>間隔(&amp;I):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>Interval</source>
+        <translation>間隔</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>The distance of regular stations, in the unit of the file</source>
+        <translation>等間隔の測点の間隔（ファイルの単位）</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>(all)</source>
+        <translation>(すべて)</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Preferences</source>
         <translation>設定</translation>
@@ -2725,8 +2890,8 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
-        <source>&amp;Data (CSV):</source>
-        <translation>データ (CSV)(&amp;D):</translation>
+        <source>&amp;Data:</source>
+        <translation>データ(&amp;D):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
@@ -2735,8 +2900,18 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
-        <source>Data (*.csv *.txt);;All files (*)</source>
-        <translation>データ (*.csv *.txt);;すべてのファイル (*)</translation>
+        <source>Data (*.csv *.txt *.xml *.landxml);;All files (*)</source>
+        <translation>データ (*.csv *.txt *.xml *.landxml);;すべてのファイル (*)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>The data file was not read to its end.</source>
+        <translation>データファイルは最後まで読み込まれませんでした。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>The data file holds nothing that is listed.</source>
+        <translation>データファイルに一覧にできるものがありません。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>

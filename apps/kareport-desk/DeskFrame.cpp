@@ -39,7 +39,7 @@ DeskFrame::DeskFrame() : files_([this](const QString &path) { fileChanged(path);
     askTemplate = [this](const QString &templateFile) -> std::optional<kareport::TemplateJob> {
         kareport::TemplateDialog dialog(this);
         if (!templateFile.isEmpty()) {
-            dialog.setTemplateFile(templateFile);
+            dialog.setFile(templateFile);
         }
         return dialog.exec() == QDialog::Accepted ? std::optional(dialog.job()) : std::nullopt;
     };

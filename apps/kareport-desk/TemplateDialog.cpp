@@ -6,6 +6,7 @@
 #include "TemplateNames.h"
 #include "TemplateSource.h"
 #include "UXmlReportTpl.h"
+#include "WorkAside.h"
 #include "Xlate.h"
 
 #include <QComboBox>
@@ -14,10 +15,14 @@
 #include <QFileInfo>
 #include <QFormLayout>
 #include <QHBoxLayout>
+#include <QJsonDocument>
 #include <QLabel>
 #include <QLineEdit>
 #include <QPushButton>
 #include <QVBoxLayout>
+
+#include <algorithm>
+#include <new>
 
 namespace kareport
 {
@@ -29,6 +34,7 @@ const QString fileEntry = QStringLiteral("Last Template File");
 const QString nameEntry = QStringLiteral("Last Template");
 const QString outputEntry = QStringLiteral("Last Template Output");
 const QString dataEntry = QStringLiteral("Last Template Data");
+const QString landXmlEntry = QStringLiteral("Last Template List"); // as in a job
 
 QHBoxLayout *withButton(QLineEdit *field, QPushButton *button)
 {
@@ -71,7 +77,8 @@ TemplateDialog::TemplateDialog(QWidget *parent)
     addRow(Xlate("&File:"), file_, withButton(file_, browseFile));
     addRow(Xlate("&Template:"), template_, template_);
     addRow(Xlate("Table or &block:"), output_, output_);
-    addRow(Xlate("&Data (CSV):"), data_, withButton(data_, browseData));
+    addRow(Xlate("&Data:"), data_, withButton(data_, browseData));
+    landXml_.emplace(*form);
     auto *layout = new QVBoxLayout(this);
     layout->addLayout(form);
     layout->addWidget(message_);
@@ -82,11 +89,12 @@ TemplateDialog::TemplateDialog(QWidget *parent)
 
     connect(browseFile, &QPushButton::clicked, this,
             [this] { browse(*file_, Xlate("Choose a template file"), Xlate("Templates (*.xml);;All files (*)")); });
-    connect(browseData, &QPushButton::clicked, this,
-            [this] { browse(*data_, Xlate("Choose a data file"), Xlate("Data (*.csv *.txt);;All files (*)")); });
+    connect(browseData, &QPushButton::clicked, this, [this] {
+        browse(*data_, Xlate("Choose a data file"), Xlate("Data (*.csv *.txt *.xml *.landxml);;All files (*)"));
+    });
     connect(file_, &QLineEdit::textChanged, this, &TemplateDialog::readTemplates);
     connect(template_, &QComboBox::currentIndexChanged, this, &TemplateDialog::readOutputs);
-    connect(data_, &QLineEdit::textChanged, this, &TemplateDialog::check);
+    connect(data_, &QLineEdit::textChanged, this, &TemplateDialog::readData);
     connect(buttons_, &QDialogButtonBox::accepted, this, &TemplateDialog::accept);
     connect(buttons_, &QDialogButtonBox::rejected, this, &TemplateDialog::reject);
 
@@ -94,6 +102,7 @@ TemplateDialog::TemplateDialog(QWidget *parent)
     template_->setCurrentIndex(qMax(0, template_->findData(GetProfileString(QString(), nameEntry))));
     output_->setCurrentIndex(qMax(0, output_->findText(GetProfileString(QString(), outputEntry))));
     data_->setText(GetProfileString(QString(), dataEntry));
+    landXml_->choose(QJsonDocument::fromJson(GetProfileString(QString(), landXmlEntry).toUtf8()).object());
     check();
 }
 
@@ -104,6 +113,10 @@ TemplateJob TemplateDialog::job() const
     job.templateName = template_->currentData().toString();
     (output_->currentData().toBool() ? job.block : job.table) = output_->currentText();
     job.data = QFileInfo(data_->text()).absoluteFilePath();
+    if (isLandXml_) {
+        job.dataKind = QStringLiteral("landxml");
+        job.dataOptions = landXml_->keys();
+    }
     return job;
 }
 
@@ -115,6 +128,13 @@ void TemplateDialog::setTemplateFile(const QString &path)
 void TemplateDialog::setData(const QString &path)
 {
     data_->setText(path);
+}
+
+void TemplateDialog::setFile(const QString &path)
+{
+    const auto file = FileBytes::open(path);
+    const auto *opened = std::get_if<std::shared_ptr<const FileBytes>>(&file);
+    (opened != nullptr && isLandXml(*opened) ? data_ : file_)->setText(path);
 }
 
 void TemplateDialog::browse(QLineEdit &field, const QString &title, const QString &filter)
@@ -168,6 +188,57 @@ void TemplateDialog::readOutputs()
     check();
 }
 
+/// Looks what the data file is.
+void TemplateDialog::readData()
+{
+    isLandXml_ = false;
+    wrongData_.clear();
+    const QString path = data_->text();
+    if (QFileInfo(path).isFile()) { // a pipe or a device might never end
+        const auto file = FileBytes::open(path);
+        if (const auto *opened = std::get_if<std::shared_ptr<const FileBytes>>(&file)) {
+            isLandXml_ = isLandXml(*opened) && readContents(*opened);
+        }
+    }
+    if (!isLandXml_) {
+        landXml_->clear();
+    }
+    check();
+    layout()->activate();
+    resize(width(), qMax(height(), sizeHint().height()));
+}
+
+/// Reads the names in a LandXML file. @return whether there is something to choose
+bool TemplateDialog::readContents(const std::shared_ptr<const FileBytes> &file)
+{
+    const auto read = std::make_shared<Expected<LandXmlContents>>();
+    const bool isDone = doAside(
+        Xlate("Reading %1").arg(QFileInfo(file->path()).fileName()), UserInput::Kept, [file, read](AsideState &state) {
+            const std::size_t size = std::max<std::size_t>(1, file->view().size());
+            try {
+                *read = readLandXmlContents(file, [&](std::size_t done) {
+                    state.setPercent(static_cast<int>(done * 100 / size));
+                    return !state.isStopped();
+                });
+            } catch (const std::bad_alloc &) {
+                *read = InputError{file->path(), std::nullopt, Xlate("there is not enough memory for it")};
+            }
+        });
+    if (!isDone) {
+        wrongData_ = Xlate("The data file was not read to its end.");
+        return false;
+    }
+    if (const InputError *error = errorOf(*read)) {
+        wrongData_ = error->message();
+        return false;
+    }
+    landXml_->offer(std::get<LandXmlContents>(*read));
+    if (!landXml_->hasList()) {
+        wrongData_ = Xlate("The data file holds nothing that is listed.");
+    }
+    return landXml_->hasList();
+}
+
 void TemplateDialog::check()
 {
     QString message = wrong_;
@@ -176,6 +247,9 @@ void TemplateDialog::check()
     }
     if (message.isEmpty() && !data_->text().isEmpty() && !QFileInfo(data_->text()).isFile()) {
         message = Xlate("There is no data file \"%1\".").arg(data_->text());
+    }
+    if (message.isEmpty()) {
+        message = wrongData_;
     }
     if (!message.isEmpty()) {
         message[0] = message[0].toUpper(); // the error of a file is the end of a sentence
@@ -191,6 +265,10 @@ void TemplateDialog::accept()
     WriteProfileString(QString(), nameEntry, template_->currentData().toString());
     WriteProfileString(QString(), outputEntry, output_->currentText());
     WriteProfileString(QString(), dataEntry, data_->text());
+    if (isLandXml_) {
+        WriteProfileString(QString(), landXmlEntry,
+                           QString::fromUtf8(QJsonDocument(landXml_->keys()).toJson(QJsonDocument::Compact)));
+    }
     QDialog::accept();
 }
 

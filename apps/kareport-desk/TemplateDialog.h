@@ -1,8 +1,12 @@
 #pragma once
 
 #include "Job.h"
+#include "LandXmlChoice.h"
 
 #include <QDialog>
+
+#include <memory>
+#include <optional>
 
 class QComboBox;
 class QDialogButtonBox;
@@ -12,8 +16,8 @@ class QLineEdit;
 namespace kareport
 {
 
-/// Asks for a template file, one of its templates, a table or block of it, and the data file to write through it. What was
-/// chosen last time is there again.
+/// Asks for a template file, one of its templates, a table or block of it, and the data file to write through it: CSV, or
+/// LandXML with what is listed of it. What was chosen last time is there again.
 class TemplateDialog : public QDialog
 {
 public:
@@ -22,20 +26,27 @@ public:
     TemplateJob job() const;
     void setTemplateFile(const QString &path);
     void setData(const QString &path);
+    /// Takes a file for the data where it is LandXML, and otherwise for the template file.
+    void setFile(const QString &path);
     void accept() override;
 
 private:
     void browse(QLineEdit &field, const QString &title, const QString &filter);
     void readTemplates();
     void readOutputs();
+    void readData();
+    bool readContents(const std::shared_ptr<const FileBytes> &file);
     void check();
 
     QLineEdit *file_;
     QComboBox *template_;
     QComboBox *output_; ///< data: true for a block
     QLineEdit *data_;
+    std::optional<LandXmlChoice> landXml_;
+    bool isLandXml_ = false; ///< the data file is
     QLabel *message_;
-    QString wrong_; ///< with the template file
+    QString wrong_;     ///< with the template file
+    QString wrongData_; ///< with the data file
     QDialogButtonBox *buttons_;
 };
 
