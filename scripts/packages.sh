@@ -58,6 +58,7 @@ packages_compare=(
     python3                 # runs the programs and writes the page
     python3-matplotlib      # its pictures
     mawk gawk sqlite3 miller # rows to text
+    xsltproc                # points of a LandXML file to text
     python3-reportlab enscript ghostscript # pages to PDF
     libreoffice-writer-nogui # pages to PDF, rich text
     pandoc unrtf            # rich text

@@ -19,6 +19,7 @@ class Command:
     most_seconds: float = 900
     ours: bool = False
     bound: bool = False  # no program for this work, but what the work can take at the least
+    processor_time: bool = False  # seconds of the processor in the place of those of the clock
 
 
 @dataclasses.dataclass
@@ -37,7 +38,7 @@ class Result:
 
 
 def run(command, folder):
-    """Wall seconds and peak kilobytes of one run; nothing when it did not finish."""
+    """Seconds and peak kilobytes of one run; nothing when it did not finish."""
     log = os.path.join(folder, "stderr.log")
     environment = {**os.environ, **command.environment}
     with open(command.output or os.devnull, "wb") as out, open(log, "wb") as err:
@@ -56,7 +57,7 @@ def run(command, folder):
     if command.own_clock:
         own_seconds, own_peak = printed.split()
         return float(own_seconds), int(own_peak)
-    return seconds, usage.ru_maxrss
+    return usage.ru_utime + usage.ru_stime if command.processor_time else seconds, usage.ru_maxrss
 
 
 def _wait(process, deadline):
