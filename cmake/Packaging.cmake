@@ -30,8 +30,8 @@ set(CPACK_COMPONENT_DEVELOPMENT_DESCRIPTION "Fixed-pitch reports for civil engin
  Headers, and what CMake and pkg-config need to link against the libraries.")
 
 set(CPACK_DEBIAN_PROGRAMS_PACKAGE_NAME kareport)
-# For the templates and the font; the programs themselves link the layers.
-set(CPACK_DEBIAN_PROGRAMS_PACKAGE_DEPENDS "libkareport0 ${same_version}")
+# libkareport0 for the templates and the font; the programs themselves link the layers. libpq5 is loaded, not linked.
+set(CPACK_DEBIAN_PROGRAMS_PACKAGE_DEPENDS "libkareport0 ${same_version}, libpq5")
 set(CPACK_DEBIAN_PROGRAMS_PACKAGE_RECOMMENDS cups)
 set(CPACK_COMPONENT_PROGRAMS_DESCRIPTION "Fixed-pitch reports for civil engineering and surveying: programs
  kareport makes reports from templates and data on the command line; kareport-desk makes, shows, edits and prints them.")

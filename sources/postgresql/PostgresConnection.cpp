@@ -1,12 +1,10 @@
 #include "PostgresConnection.h"
 
 #include "Interrupt.h"
+#include "PostgresConnector.h"
+#include "PostgresResult.h"
 #include "SocketWait.h"
 #include "Xlate.h"
-
-#include <algorithm>
-#include <array>
-#include <new>
 
 namespace kareport
 {
@@ -15,33 +13,6 @@ namespace
 {
 
 constexpr int waitMilliseconds = 50;
-/// What is asked on the way would take the place of a statement without a name.
-constexpr const char *statementName = "rows";
-/// How long a connection is waited for where nothing else is said.
-constexpr int mostMilliseconds = 60'000;
-
-PostgresResult noResult()
-{
-    return {nullptr, PQclear};
-}
-
-QString lineOf(const char *text)
-{
-    return QString::fromUtf8(text).simplified();
-}
-
-/// What the server says, with the place in the query.
-QString reasonOf(const PGresult *result)
-{
-    const QString message = lineOf(PQresultErrorField(result, PG_DIAG_MESSAGE_PRIMARY));
-    if (message.isEmpty()) {
-        return lineOf(PQresultErrorMessage(result));
-    }
-    const QString position = lineOf(PQresultErrorField(result, PG_DIAG_STATEMENT_POSITION));
-    const QString detail = lineOf(PQresultErrorField(result, PG_DIAG_MESSAGE_DETAIL));
-    return message + (position.isEmpty() ? QString() : u' ' + Xlate("(character %1 of the query)").arg(position)) +
-           (detail.isEmpty() ? QString() : QStringLiteral(". ") + detail);
-}
 
 using Options = std::unique_ptr<PQconninfoOption, void (*)(PQconninfoOption *)>;
 
@@ -50,7 +21,10 @@ using Options = std::unique_ptr<PQconninfoOption, void (*)(PQconninfoOption *)>;
 PostgresConnection::PostgresConnection(const QString &connection, const std::function<bool()> &isToStop)
     : name_(QStringLiteral("postgresql")), isToStop_(&isToStop)
 {
-    if (check(connection) && connect(connection.toUtf8())) {
+    if (!pq_.isLoaded) {
+        error_ = InputError{name_, std::nullopt,
+                            Xlate("the library libpq cannot be loaded: the package libpq5 was expected")};
+    } else if (check(connection) && connect(connection.toUtf8())) {
         begin();
     }
     isToStop_ = nullptr;
@@ -61,22 +35,24 @@ PostgresConnection::~PostgresConnection()
     if (isRunning_) {
         cancel();
     }
-    PQfinish(connection_);
+    if (connection_ != nullptr) {
+        pq_.finish(connection_);
+    }
 }
 
 /// A job goes from hand to hand, so that a secret does not belong into it. @return whether it has none
 bool PostgresConnection::check(const QString &connection)
 {
     char *message = nullptr;
-    const Options options(PQconninfoParse(connection.toUtf8().constData(), &message), PQconninfoFree);
+    const Options options(pq_.conninfoParse(connection.toUtf8().constData(), &message), pq_.conninfoFree);
     const QString reason = lineOf(message);
-    PQfreemem(message);
+    pq_.freemem(message);
     if (!options) {
-        error_ =
-            InputError{name_, std::nullopt,
-                       Xlate("this is no connection: %1. Words such as service=survey, host=..., port=..., dbname=... "
-                             "and user=... were expected")
-                           .arg(reason)};
+        error_ = InputError{
+            name_, std::nullopt,
+            Xlate("this is not a connection: %1. Words such as service=survey, host=..., port=..., dbname=... "
+                  "and user=... were expected")
+                .arg(reason)};
         return false;
     }
     for (const PQconninfoOption *option = options.get(); option->keyword != nullptr; ++option) {
@@ -100,52 +76,41 @@ bool PostgresConnection::isStopped() const
     return isStopped_ || isInterrupted() || (isToStop_ != nullptr && (*isToStop_)());
 }
 
-bool PostgresConnection::mayStillConnect(int waited) const
+std::shared_ptr<void> PostgresConnection::stopWhen(const std::function<bool()> &isToStop)
 {
-    const Options options(PQconninfo(connection_), PQconninfoFree);
-    int most = mostMilliseconds;
-    for (const PQconninfoOption *option = options.get(); option != nullptr && option->keyword != nullptr; ++option) {
-        const int seconds = qstrcmp(option->keyword, "connect_timeout") == 0 ? QByteArray(option->val).toInt() : 0;
-        most = seconds > 0 ? std::min(seconds, 100'000) * 1000 : most;
-    }
-    return waited < most;
+    isToStop_ = &isToStop;
+    return {nullptr, [this](void *) { isToStop_ = nullptr; }};
+}
+
+bool PostgresConnection::resume()
+{
+    isStopped_ = false;
+    return !error_ && !isRunning_ && !isCancelled_ && pq_.transactionStatus(connection_) == PQTRANS_INTRANS;
 }
 
 bool PostgresConnection::connect(const QByteArray &connection)
 {
-    // Of a keyword that stands twice the last counts.
-    const std::array<const char *, 4> keywords = {"dbname", "client_encoding", "fallback_application_name", nullptr};
-    const std::array<const char *, 4> values = {connection.constData(), "UTF8", "kareport", nullptr};
-    connection_ = PQconnectStartParams(keywords.data(), values.data(), 1);
-    if (connection_ == nullptr) {
-        throw std::bad_alloc();
-    }
-    PostgresPollingStatusType state = PGRES_POLLING_WRITING;
-    int waited = 0;
-    while (PQstatus(connection_) != CONNECTION_BAD && state != PGRES_POLLING_OK && state != PGRES_POLLING_FAILED) {
-        if (isStopped()) {
-            isStopped_ = true;
-            return false;
-        }
-        if (!mayStillConnect(waited)) {
-            error_ = InputError{name_, std::nullopt, Xlate("the server does not answer")};
-            return false;
-        }
-        waitForSocket(PQsocket(connection_), state == PGRES_POLLING_WRITING, waitMilliseconds);
-        waited += waitMilliseconds;
-        state = PQconnectPoll(connection_);
-    }
-    if (PQstatus(connection_) != CONNECTION_OK) {
-        error_ =
-            InputError{name_, std::nullopt,
-                       PQconnectionNeedsPassword(connection_) != 0
-                           ? Xlate("the server wants a password: it was expected in the user's own password file "
-                                   "(~/.pgpass) or in PGPASSWORD")
-                           : Xlate("the server cannot be connected to: %1").arg(lineOf(PQerrorMessage(connection_)))};
+    const auto [state, made] = connectTo(connection, [this] { return isStopped(); });
+    connection_ = made;
+    if (state == Connecting::Stopped) {
+        isStopped_ = true;
         return false;
     }
-    PQsetErrorVerbosity(connection_, PQERRORS_TERSE);
-    PQsetNoticeProcessor(
+    if (state == Connecting::TimedOut) {
+        error_ = InputError{name_, std::nullopt, Xlate("the server does not answer")};
+        return false;
+    }
+    if (pq_.status(connection_) != CONNECTION_OK) {
+        error_ =
+            InputError{name_, std::nullopt,
+                       pq_.connectionNeedsPassword(connection_) != 0
+                           ? Xlate("the server wants a password: it was expected in the user's own password file "
+                                   "(~/.pgpass) or in PGPASSWORD")
+                           : Xlate("the server cannot be connected to: %1").arg(lineOf(pq_.errorMessage(connection_)))};
+        return false;
+    }
+    pq_.setErrorVerbosity(connection_, PQERRORS_TERSE);
+    pq_.setNoticeProcessor(
         connection_, [](void *, const char *) {}, nullptr);
     return true;
 }
@@ -169,7 +134,7 @@ bool PostgresConnection::begin()
 /// Takes an answer that is as it should be; otherwise keeps why not, and there is none.
 PostgresResult PostgresConnection::expect(PostgresResult result, ExecStatusType status)
 {
-    if (!result || PQresultStatus(result.get()) == status) {
+    if (!result || pq_.resultStatus(result.get()) == status) {
         return result;
     }
     reason_ = reasonOf(result.get());
@@ -178,39 +143,35 @@ PostgresResult PostgresConnection::expect(PostgresResult result, ExecStatusType 
 
 void PostgresConnection::cancel()
 {
-    std::array<char, 256> message;
-    PGcancel *handle = PQgetCancel(connection_);
-    if (handle != nullptr) {
-        PQcancel(handle, message.data(), static_cast<int>(message.size()));
-        PQfreeCancel(handle);
-    }
+    cancelQuery(connection_);
     isRunning_ = false;
+    isCancelled_ = true;
 }
 
 /// The next answer; null when there is no other, when the connection is lost, or when it is to stop.
 PostgresResult PostgresConnection::await()
 {
     reason_.clear();
-    while (PQisBusy(connection_) != 0) {
+    while (pq_.isBusy(connection_) != 0) {
         if (isStopped()) {
             isStopped_ = true;
             cancel();
             return noResult();
         }
-        waitForSocket(PQsocket(connection_), false, waitMilliseconds);
-        if (PQconsumeInput(connection_) == 0) {
-            reason_ = lineOf(PQerrorMessage(connection_));
+        waitForSocket(pq_.socket(connection_), false, waitMilliseconds);
+        if (pq_.consumeInput(connection_) == 0) {
+            reason_ = lineOf(pq_.errorMessage(connection_));
             isRunning_ = false;
             return noResult();
         }
     }
-    return {PQgetResult(connection_), PQclear};
+    return resultOf(pq_.getResult(connection_));
 }
 
 PostgresResult PostgresConnection::ask(const char *sql)
 {
-    if (PQsendQuery(connection_, sql) == 0) {
-        reason_ = lineOf(PQerrorMessage(connection_));
+    if (pq_.sendQuery(connection_, sql) == 0) {
+        reason_ = lineOf(pq_.errorMessage(connection_));
         return noResult();
     }
     PostgresResult result = await();
@@ -219,11 +180,16 @@ PostgresResult PostgresConnection::ask(const char *sql)
     return result;
 }
 
+PostgresResult PostgresConnection::read(const char *sql)
+{
+    return expect(ask(sql), PGRES_TUPLES_OK);
+}
+
 PostgresResult PostgresConnection::prepare(const QString &query)
 {
     const auto answerOf = [this](int isSent) {
         if (isSent == 0) {
-            reason_ = lineOf(PQerrorMessage(connection_));
+            reason_ = lineOf(pq_.errorMessage(connection_));
             return noResult();
         }
         PostgresResult result = await();
@@ -231,10 +197,12 @@ PostgresResult PostgresConnection::prepare(const QString &query)
         }
         return expect(std::move(result), PGRES_COMMAND_OK);
     };
-    if (!answerOf(PQsendPrepare(connection_, statementName, query.toUtf8().constData(), 0, nullptr))) {
+    // What is asked on the way would take the place of a statement without a name.
+    statement_ = "rows" + QByteArray::number(++statements_);
+    if (!answerOf(pq_.sendPrepare(connection_, statement_.constData(), query.toUtf8().constData(), 0, nullptr))) {
         return noResult();
     }
-    return answerOf(PQsendDescribePrepared(connection_, statementName));
+    return answerOf(pq_.sendDescribePrepared(connection_, statement_.constData()));
 }
 
 bool PostgresConnection::send(const std::vector<std::optional<QByteArray>> &parameters)
@@ -243,10 +211,10 @@ bool PostgresConnection::send(const std::vector<std::optional<QByteArray>> &para
     for (const auto &parameter : parameters) {
         values.push_back(parameter ? parameter->constData() : nullptr);
     }
-    const bool isSent = PQsendQueryPrepared(connection_, statementName, static_cast<int>(values.size()), values.data(),
-                                            nullptr, nullptr, 0) != 0 &&
-                        PQsetSingleRowMode(connection_) != 0;
-    reason_ = isSent ? QString() : lineOf(PQerrorMessage(connection_));
+    const bool isSent = pq_.sendQueryPrepared(connection_, statement_.constData(), static_cast<int>(values.size()),
+                                              values.data(), nullptr, nullptr, 0) != 0 &&
+                        pq_.setSingleRowMode(connection_) != 0;
+    reason_ = isSent ? QString() : lineOf(pq_.errorMessage(connection_));
     isRunning_ = isSent;
     return isSent;
 }
@@ -257,7 +225,7 @@ PostgresResult PostgresConnection::next()
     if (!result) {
         return result;
     }
-    const ExecStatusType status = PQresultStatus(result.get());
+    const ExecStatusType status = pq_.resultStatus(result.get());
     if (status == PGRES_SINGLE_TUPLE) {
         return result;
     }
@@ -275,8 +243,8 @@ void PostgresConnection::drain()
 
 InputError PostgresConnection::failure() const
 {
-    const bool isLost = PQstatus(connection_) == CONNECTION_BAD;
-    const QString reason = reason_.isEmpty() ? lineOf(PQerrorMessage(connection_)) : reason_;
+    const bool isLost = pq_.status(connection_) == CONNECTION_BAD;
+    const QString reason = reason_.isEmpty() ? lineOf(pq_.errorMessage(connection_)) : reason_;
     return {name_, std::nullopt,
             isLost ? Xlate("the connection to the server is lost: %1").arg(reason)
                    : Xlate("the database does not answer the query: %1").arg(reason)};

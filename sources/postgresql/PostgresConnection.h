@@ -1,6 +1,7 @@
 #pragma once
 
 #include "InputError.h"
+#include "PostgresResult.h"
 
 #include <QByteArray>
 #include <QString>
@@ -11,15 +12,11 @@
 #include <optional>
 #include <vector>
 
-#include <libpq-fe.h>
-
 namespace kareport
 {
 
-/// An answer of a server.
-using PostgresResult = std::unique_ptr<PGresult, void (*)(PGresult *)>;
-
-/// A connection to a PostgreSQL server, in a transaction that only reads. Every wait ends soon after `stop`.
+/// A connection to a PostgreSQL server, in a transaction that only reads and sees one state of the database. Every wait ends soon
+/// after `stop`.
 class PostgresConnection
 {
 public:
@@ -34,9 +31,12 @@ public:
     /// What messages call it.
     const QString &name() const { return name_; }
 
-    /// The answer to a statement that was made here; null when it has none, which `failure` explains.
-    PostgresResult ask(const char *sql);
-    /// Has a query prepared. @return the description of its columns and parameters; null when it is wrong
+    /// Has waits end when a function says so, which is asked a few times a second, as long as what comes back exists.
+    [[nodiscard]] std::shared_ptr<void> stopWhen(const std::function<bool()> &isToStop);
+
+    /// The rows of a query that was made here; null when there is no answer, which `failure` explains.
+    PostgresResult read(const char *sql);
+    /// Has a query prepared, in the place of the one before. @return the description of its columns and parameters; null when it is wrong
     PostgresResult prepare(const QString &query);
     /// Sends the query that was prepared, whose rows come one by one from `next`.
     bool send(const std::vector<std::optional<QByteArray>> &parameters);
@@ -50,24 +50,30 @@ public:
 
     /// Ends what is running, from any thread.
     void stop() { isStopped_ = true; }
+    /// Lets the connection be used again after `stop`. @return whether it can be: a query that was ended ends it as well
+    bool resume();
     bool isStopped() const;
 
 private:
     bool check(const QString &connection);
     bool connect(const QByteArray &connection);
     bool begin();
-    bool mayStillConnect(int waited) const;
     void cancel();
+    PostgresResult ask(const char *sql);
     PostgresResult await();
     PostgresResult expect(PostgresResult result, ExecStatusType status);
 
+    const LibPq &pq_ = libPq();
     QString name_;
     PGconn *connection_ = nullptr;
     std::optional<InputError> error_;
-    const std::function<bool()> *isToStop_ = nullptr; ///< while connecting
+    const std::function<bool()> *isToStop_ = nullptr; ///< null where nobody is asked
     std::atomic<bool> isStopped_ = false;
-    bool isRunning_ = false; ///< rows may still come
-    QString reason_;         ///< of the last failure
+    bool isRunning_ = false;   ///< rows may still come
+    bool isCancelled_ = false; ///< a query was ended, and the transaction with it
+    QByteArray statement_;     ///< the name of the query that was prepared last
+    int statements_ = 0;       ///< how many were prepared
+    QString reason_;           ///< of the last failure
 };
 
 } // namespace kareport

@@ -5,11 +5,14 @@
 
 #include <QString>
 
+#include <memory>
 #include <optional>
 #include <vector>
 
 namespace kareport
 {
+
+class PostgresConnection;
 
 /// What is read from a PostgreSQL database: what a query answers.
 struct PostgresQuery
@@ -32,6 +35,10 @@ class PostgresObjectList : public RowObjectList
 public:
     /// Connects and finds the columns; that may take a while, so `progress` is asked meanwhile.
     PostgresObjectList(const PostgresQuery &query, const Variables &variables, const ReadProgress &progress);
+    /// The same on a connection that may serve other lists, one at a time, which then are of one state of the database.
+    /// @param connection  is made where there is none yet, or where it can no longer be used
+    PostgresObjectList(std::shared_ptr<PostgresConnection> &connection, const PostgresQuery &query,
+                       const Variables &variables, const ReadProgress &progress);
 };
 
 } // namespace kareport

@@ -1,12 +1,14 @@
 #pragma once
 
 #include "GeometryColumns.h"
+#include "LibPq.h"
 #include "PostgresConnection.h"
 #include "PostgresObjectList.h"
 #include "RowReader.h"
 
 #include <QHash>
 
+#include <memory>
 #include <optional>
 #include <string_view>
 #include <vector>
@@ -18,18 +20,22 @@ namespace kareport
 class PostgresRows : public RowReader
 {
 public:
-    /// Connects and finds the columns; no row is read. @param isToStop  asked meanwhile
-    PostgresRows(const PostgresQuery &query, const Variables &variables, const std::function<bool()> &isToStop);
+    /// Finds the columns; no row is read. @param isToStop  asked meanwhile
+    PostgresRows(std::shared_ptr<PostgresConnection> connection, const PostgresQuery &query, const Variables &variables,
+                 const std::function<bool()> &isToStop);
 
     bool next(UDataObject &object, const std::vector<unsigned> *onlyIds) override;
     void rewind() override;
     std::size_t position() const override { return row_; }
     std::size_t rowBytes() const override { return rowBytes_; }
-    QString name() const override { return connection_.name(); }
+    QString name() const override { return connection_->name(); }
     bool mayWait() const override { return true; }
-    void stop() override { connection_.stop(); }
+    void stop() override { connection_->stop(); }
 
 private:
+    /// The type of a column of bytes, which has this number in every database.
+    static constexpr Oid bytesType = 17;
+
     /// Where the value of a field comes from.
     struct Source
     {
@@ -46,9 +52,11 @@ private:
     bool storeCell(const BoundField &field, const PGresult *row, int column, UDataObject &object);
     bool readGeometry(const PGresult *row);
     bool fail(const QString &text);
+    bool failUnlessStopped();
     bool failInRow(const QString &text);
 
-    PostgresConnection connection_;
+    const LibPq &pq_ = libPq();
+    std::shared_ptr<PostgresConnection> connection_;
     std::vector<std::optional<QByteArray>> parameters_;
     std::size_t ownColumns_ = 0;        ///< columns of the data itself; those of a geometry follow
     std::optional<int> geometryColumn_; ///< of the answer

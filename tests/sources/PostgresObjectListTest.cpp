@@ -251,6 +251,47 @@ TEST_F(PostgresServer, RowsAreOfOneState)
     EXPECT_EQ(rowsOf(query("SELECT * FROM state")), "number=1\nnumber=2");
 }
 
+TEST_F(PostgresServer, ListsOfOneConnectionAreOfOneState)
+{
+    server().runSql("CREATE TABLE shared (number text); INSERT INTO shared VALUES ('1')");
+    std::shared_ptr<kareport::PostgresConnection> connection;
+    const auto rows = [&](const char *sql) {
+        PostgresObjectList list(connection, query(sql), survey::variables(), {});
+        return survey::rowsOf(list).join(u'\n').toStdString();
+    };
+    EXPECT_EQ(rows("SELECT * FROM shared"), "number=1");
+    server().runSql("INSERT INTO shared VALUES ('2')");
+    EXPECT_EQ(rows("SELECT * FROM shared"), "number=1") << "as the list before saw it";
+    EXPECT_EQ(rows("SELECT number || 'x' AS number FROM shared"), "number=1x") << "with another query";
+    EXPECT_TRUE(rows("SELECT 1 / 0 AS number").starts_with("error ")) << "a query that fails ends the transaction";
+    EXPECT_EQ(rows("SELECT * FROM shared"), "number=1\nnumber=2") << "a new one is begun";
+    {
+        PostgresObjectList left(connection, query("SELECT i AS count FROM generate_series(1, 100000) i"),
+                                survey::variables(), {});
+        ASSERT_NE(left.GetAt(0), nullptr);
+    }
+    EXPECT_EQ(rows("SELECT * FROM shared"), "number=1\nnumber=2") << "after a list that was not read to its end";
+}
+
+TEST_F(PostgresServer, NumbersAreWholeAndBytesAreNoText)
+{
+    EXPECT_EQ(rowsOf(query("SELECT 5.0::numeric AS count")), "count=5");
+    EXPECT_EQ(rowsOf(query("SELECT 7::float8 AS count")), "count=7");
+    EXPECT_TRUE(rowsOf(query("SELECT 5.5::numeric AS count")).starts_with("error row 1: the value \"5.5\""));
+    EXPECT_TRUE(rowsOf(query("SELECT '5.0'::text AS count")).starts_with("error row 1: the value \"5.0\""));
+    EXPECT_EQ(rowsOf(query("SELECT 'AB'::bytea AS description")),
+              "error row 1: the value \"2 bytes\" of the column \"description\" does not fit: a text was expected");
+}
+
+TEST_F(PostgresServer, AReferenceSystemThatCannotBeReadIsSaid)
+{
+    server().runSql("CREATE TABLE spatial_ref_sys (srid int)");
+    EXPECT_TRUE(rowsOf(query("SELECT 1 AS number, '\\x0101000000000000000000F03F0000000000000040'::bytea AS geom", {},
+                             {{"Description", QStringLiteral("@srs")}}))
+                    .starts_with("error the database does not answer the query: column \"auth_name\" does not exist"));
+    server().runSql("DROP TABLE spatial_ref_sys");
+}
+
 TEST_F(PostgresServer, AQueryThatRunsLongCanBeStopped)
 {
     constexpr int mostCalls = 40; // more than it takes to connect

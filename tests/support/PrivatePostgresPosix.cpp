@@ -1,12 +1,12 @@
 #include "PrivatePostgresPosix.h"
 
+#include "PostgresConnector.h"
+
 #include <QFile>
 
 #include <gtest/gtest.h>
 
 #include <csignal>
-
-#include <libpq-fe.h>
 
 PrivatePostgres::PrivatePostgres()
 {
@@ -40,12 +40,16 @@ QString PrivatePostgres::guardedConnection() const
 
 void PrivatePostgres::runSql(const QByteArray &sql) const
 {
-    PGconn *connection = PQconnectdb(this->connection().toUtf8().constData());
-    PGresult *result = PQexec(connection, sql.constData());
-    const ExecStatusType status = PQresultStatus(result);
-    EXPECT_TRUE(status == PGRES_COMMAND_OK || status == PGRES_TUPLES_OK) << PQerrorMessage(connection);
-    PQclear(result);
-    PQfinish(connection);
+    const kareport::LibPq &pq = kareport::libPq();
+    PGconn *made = kareport::connectTo(connection().toUtf8(), [] { return false; }).second;
+    ASSERT_EQ(pq.status(made), CONNECTION_OK) << pq.errorMessage(made);
+    EXPECT_NE(pq.sendQuery(made, sql.constData()), 0);
+    while (PGresult *result = pq.getResult(made)) {
+        const ExecStatusType status = pq.resultStatus(result);
+        EXPECT_TRUE(status == PGRES_COMMAND_OK || status == PGRES_TUPLES_OK) << pq.errorMessage(made);
+        pq.clear(result);
+    }
+    pq.finish(made);
 }
 
 void PrivatePostgres::kill()

@@ -1,0 +1,133 @@
+#include "PostgresRows.h"
+
+#include "Xlate.h"
+
+#include <algorithm>
+
+// How the columns of a query are found.
+
+namespace kareport
+{
+
+bool PostgresRows::prepare(const PostgresQuery &query)
+{
+    const PostgresResult description = connection_->prepare(query.query);
+    if (!description) {
+        return failUnlessStopped();
+    }
+    const int wanted = pq_.nparams(description.get());
+    if (wanted != static_cast<int>(parameters_.size())) {
+        return fail(Xlate("the query has %1 parameters: values of %2 are given").arg(wanted).arg(parameters_.size()));
+    }
+    if (pq_.nfields(description.get()) == 0) {
+        return fail(Xlate("the query is not a single SELECT, which was expected"));
+    }
+    return findColumns(description.get());
+}
+
+bool PostgresRows::findColumns(const PGresult *description)
+{
+    for (int i = 0; i < pq_.nfields(description); ++i) {
+        columns_.push_back({QString::fromUtf8(pq_.fname(description, i)), std::nullopt, false});
+    }
+    ownColumns_ = columns_.size();
+    std::vector<Oid> types;
+    const bool hasOwnTypes = [&] {
+        for (int i = 0; i < pq_.nfields(description); ++i) {
+            if (pq_.ftype(description, i) >= 16384 || pq_.ftype(description, i) == bytesType)
+            { // not of the server itself
+                return true;
+            }
+        }
+        return false;
+    }();
+    if (hasOwnTypes) {
+        const PostgresResult found =
+            connection_->read("SELECT oid FROM pg_type WHERE typname IN ('geometry', 'geography')");
+        if (!found) {
+            return failUnlessStopped();
+        }
+        for (int i = 0; i < pq_.ntuples(found.get()); ++i) {
+            types.push_back(QByteArray(pq_.getvalue(found.get(), i, 0)).toUInt());
+        }
+    }
+    geometryColumn_ = geometryColumnOf(description, types);
+    if (geometryColumn_) {
+        columns_[static_cast<std::size_t>(*geometryColumn_)].isOffered = true; // its parts are what is read
+        offerGeometryParts(columns_);
+    }
+    return !error_;
+}
+
+/// The column of geometries, or else the only one of bytes. Two of geometries are an error.
+std::optional<int> PostgresRows::geometryColumnOf(const PGresult *description, const std::vector<Oid> &types)
+{
+    std::vector<int> geometries;
+    std::vector<int> bytes;
+    for (int i = 0; i < pq_.nfields(description); ++i) {
+        const Oid type = pq_.ftype(description, i);
+        if (std::find(types.begin(), types.end(), type) != types.end()) {
+            geometries.push_back(i);
+        } else if (type == bytesType) {
+            bytes.push_back(i);
+        }
+    }
+    if (geometries.size() > 1) {
+        fail(Xlate("the columns \"%1\" and \"%2\" both have geometries: a query with one of them was expected")
+                 .arg(columns_[static_cast<std::size_t>(geometries[0])].name,
+                      columns_[static_cast<std::size_t>(geometries[1])].name));
+        return std::nullopt;
+    }
+    const std::vector<int> &found = geometries.empty() ? bytes : geometries;
+    return found.size() == 1 ? std::optional(found.front()) : std::nullopt;
+}
+
+bool PostgresRows::bindColumns(const PostgresQuery &query, const Variables &variables)
+{
+    if (const auto fault = binding_.bind(columns_, query.columns, variables)) {
+        if (!fault->choice.isEmpty()) {
+            wrongChoice_ = fault;
+        }
+        return fail(fault->text);
+    }
+    if (binding_.fields().empty()) {
+        return fail(Xlate("no column is a variable of the dictionary: there are %1")
+                        .arg(namesOf(columns_).join(QStringLiteral(", "))));
+    }
+    for (const BoundField &field : binding_.fields()) {
+        Source &source = sources_.emplace_back();
+        if (field.column < ownColumns_) {
+            source.column = static_cast<int>(field.column);
+        } else {
+            source.part = geometryParts[field.column - ownColumns_].first;
+            needsGeometry_ = true;
+        }
+    }
+    return true;
+}
+
+/// Reads the reference systems, which the database describes where PostGIS is installed.
+void PostgresRows::readSystems()
+{
+    const PostgresResult table = connection_->read("SELECT to_regclass('spatial_ref_sys') IS NOT NULL");
+    if (!table) {
+        failUnlessStopped();
+        return;
+    }
+    if (pq_.getvalue(table.get(), 0, 0)[0] != 't') {
+        return;
+    }
+    const PostgresResult rows = connection_->read("SELECT srid, auth_name || ':' || auth_srid, "
+                                                  "substring(srtext from '\"([^\"]*)\"') FROM spatial_ref_sys");
+    if (!rows) {
+        failUnlessStopped();
+        return;
+    }
+    for (int i = 0; i < pq_.ntuples(rows.get()); ++i) {
+        systems_.insert(
+            QByteArray(pq_.getvalue(rows.get(), i, 0)).toInt(),
+            {QString::fromUtf8(pq_.getvalue(rows.get(), i, 1)), QString::fromUtf8(pq_.getvalue(rows.get(), i, 2))});
+    }
+}
+
+} // namespace kareport
