@@ -162,6 +162,15 @@ Expected<SqliteStatement> SqliteFile::prepareQuery(const QString &sql)
     return statement;
 }
 
+bool SqliteFile::has(const QString &table)
+{
+    const SqliteStatement found = prepare(
+        QStringLiteral("SELECT 1 FROM sqlite_master WHERE type IN ('table', 'view') AND lower(name) = lower(?)"));
+    const QByteArray name = table.toUtf8();
+    return found && sqlite3_bind_text(found.get(), 1, name.constData(), -1, SQLITE_TRANSIENT) == SQLITE_OK &&
+           sqlite3_step(found.get()) == SQLITE_ROW;
+}
+
 QStringList SqliteFile::tables()
 {
     const SqliteStatement names = prepare(QStringLiteral(
@@ -188,7 +197,7 @@ QString SqliteFile::reasonOf(int code) const
     switch (code & 0xFF) {
     case SQLITE_BUSY:
     case SQLITE_LOCKED: return Xlate("the database is locked: another program writes to it");
-    case SQLITE_NOTADB: return Xlate("the file is no SQLite database, or it is encrypted");
+    case SQLITE_NOTADB: return Xlate("the file is not a SQLite database, or it is encrypted");
     case SQLITE_CORRUPT: return Xlate("the database is broken: %1").arg(text);
     case SQLITE_READONLY:
         return Xlate(

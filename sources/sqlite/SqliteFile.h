@@ -37,6 +37,10 @@ public:
     /// The statement of a query that somebody wrote: one SELECT and nothing else.
     Expected<SqliteStatement> prepareQuery(const QString &sql);
 
+    /// Whether it has a table or a view of a name.
+    bool has(const QString &table);
+    /// What the last call answered.
+    int lastCode() const { return sqlite3_extended_errcode(database_); }
     /// Names of its tables and views, but for those that belong to the format.
     QStringList tables();
 
@@ -47,6 +51,8 @@ public:
 
     /// Ends what is running, from any thread.
     void stop() { isStopped_ = true; }
+    /// Lets it be read again after `stop`, in the same state.
+    void resume() { isStopped_ = false; }
     bool isStopped() const { return isStopped_; }
 
 private:

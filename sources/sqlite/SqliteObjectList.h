@@ -5,10 +5,13 @@
 
 #include <QString>
 
+#include <memory>
 #include <vector>
 
 namespace kareport
 {
+
+class SqliteFile;
 
 /// What is read from a SQLite database, a GeoPackage among them: all rows of a table or a view, or what a query answers.
 struct SqliteQuery
@@ -27,8 +30,14 @@ struct SqliteQuery
 class SqliteObjectList : public RowObjectList
 {
 public:
-    /// Opens the database and finds the columns.
+    /// Finds the columns. @param file  the database of the query, opened for reading. Lists of one file are of one state
+    SqliteObjectList(std::shared_ptr<SqliteFile> file, const SqliteQuery &query, const Variables &variables,
+                     ReadProgress progress);
+    /// The same with a database that is opened for this list alone.
     SqliteObjectList(const SqliteQuery &query, const Variables &variables, ReadProgress progress);
+
+    /// Opens a database. What is wrong with it makes the list fail.
+    static std::shared_ptr<SqliteFile> openFile(const QString &path);
 };
 
 } // namespace kareport

@@ -1,6 +1,5 @@
 #include "SqliteRows.h"
 
-#include "NearestName.h"
 #include "NumberText.h"
 #include "Xlate.h"
 
@@ -14,138 +13,15 @@ namespace
 
 constexpr qsizetype longestQuote = 40;
 
-/// A name in a query.
-QString quoted(const QString &name)
-{
-    return u'"' + QString(name).replace(u'"', QStringLiteral("\"\"")) + u'"';
-}
-
-QString withTables(const QString &table, const QStringList &tables)
-{
-    const QString sentence = Xlate("the database has no table \"%1\"").arg(table);
-    const QString question = didYouMean(table, tables);
-    return sentence + QStringLiteral(": ") +
-           (!question.isEmpty() ? question
-                                : Xlate("one of %1 was expected")
-                                      .arg(tables.isEmpty() ? Xlate("none") : tables.join(QStringLiteral(", "))));
-}
-
 } // namespace
 
-SqliteRows::SqliteRows(const SqliteQuery &query, const Variables &variables) : file_(query.file), geometry_(file_)
+SqliteRows::SqliteRows(std::shared_ptr<SqliteFile> file, const SqliteQuery &query, const Variables &variables)
+    : file_(std::move(file)), geometry_(*file_)
 {
-    error_ = file_.error();
+    error_ = file_->error() ? file_->error() : geometry_.error();
     if (!error_ && prepareAll(query) && findColumns(query) && bindColumns(query, variables)) {
         prepareNeeded(query);
     }
-}
-
-/// Prepares what all columns are known by.
-bool SqliteRows::prepareAll(const SqliteQuery &query)
-{
-    if (!query.table.isEmpty()) {
-        const QStringList tables = file_.tables();
-        const bool isThere = file_.prepare(QStringLiteral("SELECT * FROM ") + quoted(query.table)) != nullptr;
-        if (!isThere && !tables.contains(query.table, Qt::CaseInsensitive)) {
-            error_ = InputError{query.file, std::nullopt, withTables(query.table, tables)};
-            return false;
-        }
-    }
-    auto statement = file_.prepareQuery(query.table.isEmpty() ? query.query
-                                                              : QStringLiteral("SELECT * FROM ") + quoted(query.table));
-    if (const InputError *wrong = errorOf(statement)) {
-        error_ = *wrong;
-        return false;
-    }
-    statement_ = std::move(std::get<SqliteStatement>(statement));
-    return true;
-}
-
-bool SqliteRows::findColumns(const SqliteQuery &query)
-{
-    for (int i = 0; i < sqlite3_column_count(statement_.get()); ++i) {
-        columns_.push_back({QString::fromUtf8(sqlite3_column_name(statement_.get(), i)), std::nullopt, false});
-        const QString table = QString::fromUtf8(sqlite3_column_table_name(statement_.get(), i));
-        const QString origin = QString::fromUtf8(sqlite3_column_origin_name(statement_.get(), i));
-        // A view is registered by its own name, though its columns come from a table.
-        const bool isGeometry = geometry_.isGeometry(table, origin) ||
-                                (!query.table.isEmpty() && geometry_.isGeometry(query.table, columns_.back().name));
-        if (isGeometry && geometryColumn_) {
-            error_ =
-                InputError{query.file, std::nullopt,
-                           Xlate("the columns \"%1\" and \"%2\" both have geometries: a query with one of them was "
-                                 "expected")
-                               .arg(columns_[static_cast<std::size_t>(*geometryColumn_)].name, columns_.back().name)};
-            return false;
-        }
-        geometryColumn_ = isGeometry ? std::optional(i) : geometryColumn_;
-    }
-    ownColumns_ = columns_.size();
-    if (geometryColumn_) {
-        columns_[static_cast<std::size_t>(*geometryColumn_)].isOffered = true; // its parts are what is read
-        offerGeometryParts(columns_);
-    }
-    return true;
-}
-
-bool SqliteRows::bindColumns(const SqliteQuery &query, const Variables &variables)
-{
-    if (const auto fault = binding_.bind(columns_, query.columns, variables)) {
-        if (!fault->choice.isEmpty()) {
-            wrongChoice_ = fault;
-        }
-        error_ = InputError{query.file, std::nullopt, fault->text};
-        return false;
-    }
-    if (binding_.fields().empty()) {
-        error_ = InputError{query.file, std::nullopt,
-                            Xlate("no column is a variable of the dictionary: there are %1")
-                                .arg(namesOf(columns_).join(QStringLiteral(", ")))};
-        return false;
-    }
-    for (const BoundField &field : binding_.fields()) {
-        Source &source = sources_.emplace_back();
-        if (field.column < ownColumns_) {
-            source.column = static_cast<int>(field.column);
-        } else {
-            source.part = geometryParts[field.column - ownColumns_].first;
-            needsGeometry_ = true;
-        }
-    }
-    return true;
-}
-
-/// Prepares a table anew with the columns alone that are read: a polygon nobody asks for is not fetched.
-bool SqliteRows::prepareNeeded(const SqliteQuery &query)
-{
-    if (query.table.isEmpty()) {
-        return true;
-    }
-    std::vector<int> needed;
-    for (const Source &source : sources_) {
-        needed.push_back(source.part ? *geometryColumn_ : source.column);
-    }
-    std::sort(needed.begin(), needed.end());
-    needed.erase(std::unique(needed.begin(), needed.end()), needed.end());
-    const auto indexOf = [&needed](int column) {
-        return static_cast<int>(std::lower_bound(needed.begin(), needed.end(), column) - needed.begin());
-    };
-    QStringList names;
-    for (const int column : needed) {
-        names.append(quoted(columns_[static_cast<std::size_t>(column)].name));
-    }
-    for (Source &source : sources_) {
-        source.column = source.part ? -1 : indexOf(source.column);
-    }
-    geometryColumn_ = needsGeometry_ ? std::optional(indexOf(*geometryColumn_)) : std::nullopt;
-    auto statement = file_.prepareQuery(
-        QStringLiteral("SELECT %1 FROM %2").arg(names.join(QStringLiteral(", ")), quoted(query.table)));
-    if (const InputError *wrong = errorOf(statement)) {
-        error_ = *wrong;
-        return false;
-    }
-    statement_ = std::move(std::get<SqliteStatement>(statement));
-    return true;
 }
 
 void SqliteRows::rewind()
@@ -157,10 +33,10 @@ void SqliteRows::rewind()
 
 bool SqliteRows::next(UDataObject &object, const std::vector<unsigned> * /*onlyIds*/)
 {
-    const int code = file_.isStopped() ? SQLITE_INTERRUPT : sqlite3_step(statement_.get());
+    const int code = file_->isStopped() ? SQLITE_INTERRUPT : sqlite3_step(statement_.get());
     if (code != SQLITE_ROW) {
         if (code != SQLITE_DONE && (code & 0xFF) != SQLITE_INTERRUPT) {
-            error_ = file_.failure(code);
+            error_ = file_->failure(code);
         }
         return false;
     }
@@ -236,7 +112,7 @@ bool SqliteRows::readGeometry()
 
 bool SqliteRows::failInRow(const QString &text)
 {
-    error_ = InputError{file_.path(), std::nullopt, Xlate("row %1: ").arg(row_) + text};
+    error_ = InputError{file_->path(), std::nullopt, Xlate("row %1: ").arg(row_) + text};
     return false;
 }
 

@@ -15,17 +15,18 @@ namespace kareport
 class SqliteRows : public RowReader
 {
 public:
-    /// Opens the database and finds the columns; no row is read.
-    SqliteRows(const SqliteQuery &query, const Variables &variables);
+    /// Finds the columns; no row is read.
+    /// @param file  the database of the query
+    SqliteRows(std::shared_ptr<SqliteFile> file, const SqliteQuery &query, const Variables &variables);
 
     bool next(UDataObject &object, const std::vector<unsigned> *onlyIds) override;
     void rewind() override;
     std::size_t position() const override { return row_; }
     std::size_t rowBytes() const override { return rowBytes_; }
-    std::optional<InputError> lostBytes() const override { return file_.changed(); }
-    QString name() const override { return file_.path(); }
+    std::optional<InputError> lostBytes() const override { return file_->changed(); }
+    QString name() const override { return file_->path(); }
     bool mayWait() const override { return true; }
-    void stop() override { file_.stop(); }
+    void stop() override { file_->stop(); }
 
 private:
     /// Where the value of a field comes from.
@@ -46,7 +47,7 @@ private:
     bool failInRow(const QString &text);
     bool failInCell(const BoundField &field, int column);
 
-    SqliteFile file_;
+    std::shared_ptr<SqliteFile> file_;
     SqliteGeometry geometry_;
     SqliteStatement statement_{nullptr, sqlite3_finalize};
     std::size_t ownColumns_ = 0;        ///< columns of the data itself; those of a geometry follow

@@ -104,6 +104,53 @@ TEST(SqliteObjectList, ReadsTablesViewsAndQueries)
         << "sorted by the template";
 }
 
+TEST(SqliteObjectList, RowsOfATableHaveItsOrder)
+{
+    // The index has all that is read, so that SQLite would read it instead of the table.
+    const Database indexed("CREATE TABLE t (id INTEGER PRIMARY KEY, Number, Northing, rest);"
+                           "INSERT INTO t VALUES (1, 'b', 2, 0), (2, 'a', 1, 0), (3, 'c', 0, 0);"
+                           "CREATE INDEX i ON t (Number, Northing)");
+    EXPECT_EQ(joined(rowsOf(indexed.table("t"))), "number=b northing=2\nnumber=a northing=1\nnumber=c northing=0");
+    const Database keyed("CREATE TABLE t (Number PRIMARY KEY, Northing) WITHOUT ROWID;"
+                         "INSERT INTO t VALUES ('b', 2), ('a', 1); CREATE VIEW v AS SELECT * FROM t;"
+                         "CREATE VIRTUAL TABLE r USING rtree(Count, Northing, Easting);"
+                         "INSERT INTO r VALUES (7, 1, 2)");
+    EXPECT_EQ(joined(rowsOf(keyed.table("t"))), "number=a northing=1\nnumber=b northing=2") << "a table without rowids";
+    EXPECT_EQ(rowsOf(keyed.table("v")).size(), 2) << "a view";
+    EXPECT_EQ(joined(rowsOf(keyed.table("r"))), "northing=1 easting=2 count=7") << "a virtual table";
+}
+
+TEST(SqliteObjectList, AGeoPackageThatDoesNotDescribeItselfIsSaid)
+{
+    const Database broken(
+        "CREATE TABLE gpkg_geometry_columns (wrong); CREATE TABLE t (Number); INSERT INTO t VALUES (1)");
+    EXPECT_EQ(joined(rowsOf(broken.table("t"))),
+              "error the database does not answer the query: no such column: table_name");
+    const QByteArray layer = "CREATE TABLE t (Number, geom); INSERT INTO t VALUES (1, " +
+                             geo::pointLiteral(1, 2, none, none, 25832) +
+                             "); INSERT INTO gpkg_geometry_columns VALUES ('t', 'geom', 'POINT', 25832, 0, 0);"
+                             "ALTER TABLE gpkg_spatial_ref_sys RENAME COLUMN organization TO other";
+    const Database unsystematic(geo::packageSql() + layer);
+    EXPECT_EQ(joined(rowsOf(unsystematic.table("t", {{"Northing", QStringLiteral("@y")}}))), "number=1 northing=2")
+        << "nobody asks for the reference system";
+    EXPECT_EQ(joined(rowsOf(unsystematic.table("t", {{"Description", QStringLiteral("@srs")}}))),
+              "error the database does not answer the query: no such column: organization");
+}
+
+TEST(SqliteObjectList, ListsOfOneFileAreOfOneState)
+{
+    const Database database("PRAGMA journal_mode = WAL; CREATE TABLE t (Number); INSERT INTO t VALUES (1)");
+    const auto file = SqliteObjectList::openFile(database.path());
+    const auto rows = [&] {
+        SqliteObjectList list(file, database.table("t"), survey::variables(), {});
+        return joined(survey::rowsOf(list));
+    };
+    EXPECT_EQ(rows(), "number=1");
+    geo::runSql(database.path(), "INSERT INTO t VALUES (2)");
+    EXPECT_EQ(rows(), "number=1") << "as the list before saw it";
+    EXPECT_EQ(joined(rowsOf(database.table("t"))), "number=1\nnumber=2") << "another one sees what is there";
+}
+
 TEST(SqliteObjectList, ValuesFitTheTypesOfTheirVariables)
 {
     struct Row
@@ -251,8 +298,8 @@ TEST(SqliteObjectList, FilesThatAreNoDatabase)
     const QByteArray whole = file.readAll();
     const Row rows[] = {
         {"", "error the database has no table \"points\": one of none was expected", "an empty file"},
-        {"Number,Northing\n1,2\n", "error the file is no SQLite database, or it is encrypted", "a text"},
-        {encrypted, "error the file is no SQLite database, or it is encrypted", "bytes without a sense"},
+        {"Number,Northing\n1,2\n", "error the file is not a SQLite database, or it is encrypted", "a text"},
+        {encrypted, "error the file is not a SQLite database, or it is encrypted", "bytes without a sense"},
         {whole.left(1024), "error the database is broken: database disk image is malformed", "cut short"},
         {whole.left(4096) + QByteArray(whole.size() - 4096, '\x5A'),
          "error the database is broken: database disk image is malformed", "a broken table"},
@@ -461,7 +508,7 @@ TEST(SqliteObjectList, WhatIsNoPointIsSaid)
         << "where it is not asked for, it may be anything";
     geo::runSql(database.path(), "UPDATE lines SET geom = 'text' WHERE fid = 2");
     EXPECT_EQ(joined(rowsOf(database.table("lines", {{"Easting", QStringLiteral("@x")}}))),
-              "number=1 easting=1\nerror row 2: there is bytes that are no geometry: a point was expected");
+              "number=1 easting=1\nerror row 2: there is bytes that are not a geometry: a point was expected");
     geo::runSql(database.path(),
                 "INSERT INTO gpkg_geometry_columns VALUES ('lines', 'second', 'GEOMETRY', 25832, 0, 0)");
     EXPECT_EQ(joined(rowsOf(database.table("lines", {{"Easting", QStringLiteral("@x")}}))),
