@@ -119,7 +119,7 @@ std::optional<ColumnFault> ColumnBinding::bindChoices(std::vector<SourceColumn> 
             return ColumnFault{index, choice.variable, twice(*column, index, found.name)};
         }
         found.isKnown = true;
-        fields_.push_back({*column, found.name.isEmpty() ? choice.variable : found.name, *parser});
+        fields_.push_back({*column, found.name.isEmpty() ? choice.variable : found.name, *parser, choice.variable});
     }
     return std::nullopt;
 }
@@ -152,7 +152,7 @@ std::optional<ColumnFault> ColumnBinding::bindNames(std::vector<SourceColumn> &c
         names.insert(key, {i, parser.has_value()});
         if (parser) {
             column.isKnown = true;
-            fields_.push_back({i, column.name, *parser});
+            fields_.push_back({i, column.name, *parser, column.name});
         }
     }
     return std::nullopt;
@@ -164,6 +164,15 @@ void ColumnBinding::noteIds()
         const unsigned id = field.parser.id();
         (std::find(ids_.begin(), ids_.end(), id) == ids_.end() ? ids_ : sharedIds_).push_back(id);
     }
+}
+
+QStringList ColumnBinding::variables() const
+{
+    QStringList names;
+    for (const BoundField &field : fields_) {
+        names.append(foldedKey(field.variable));
+    }
+    return names;
 }
 
 void ColumnBinding::storeNone(const BoundField &field, UDictionary &object) const

@@ -45,6 +45,7 @@ struct BoundField
     std::size_t column; ///< index of the column
     QString name;       ///< what messages call it
     ValueParser parser;
+    QString variable; ///< its name, as the choice or the column has it
 };
 
 /// What is wrong with the choice of columns.
@@ -70,6 +71,8 @@ public:
     const std::vector<BoundField> &fields() const { return fields_; }
     /// The identifiers that values are stored under, each once.
     const std::vector<unsigned> &ids() const { return ids_; }
+    /// The names of the variables that are read, folded, each once.
+    QStringList variables() const;
 
     /// Makes an object ready for the values of a row: it may hold those of an earlier one, which none of the cells has to
     /// replace.

@@ -34,11 +34,23 @@ public:
     const QString &path() const { return path_; }
     /// Says that what stands before a byte is not read again soon.
     void release(std::size_t end) const { mapped_.release(end); }
+    /// Gives the memory of what was read back to the system, a large piece at a time, for whoever reads on from there.
+    /// @param end       what stands before it is not read again soon
+    /// @param released  up to where memory was given back; it is moved on
+    void releaseBefore(std::size_t end, std::size_t &released) const
+    {
+        constexpr std::size_t piece = std::size_t(1) << 22;
+        if (end > released && end - released >= piece) {
+            releasePiece(released, end);
+            released = end;
+        }
+    }
     /// What went wrong since the file was opened: bytes that were cut off meanwhile read as zeros. It must be asked when all
     /// was read, and when what was read is wrong.
     std::optional<InputError> lostBytes() const;
 
 private:
+    void releasePiece(std::size_t begin, std::size_t end) const;
     static Expected<std::shared_ptr<const FileBytes>> ofHandle(const QString &path, int handle);
     std::optional<QString> read(qint64 size);
     std::optional<QString> readPipe();

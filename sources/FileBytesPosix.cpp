@@ -136,7 +136,8 @@ std::optional<QString> FileBytes::readPipe()
             return spooled_.wrong();
         }
         if (spooled_.size() > largestUnmapped) {
-            return Xlate("more than %1 MB come out of what is no file").arg(largestUnmapped >> 20);
+            return Xlate("the pipe or device gives more than %1 MB, the most that was expected")
+                .arg(largestUnmapped >> 20);
         }
     }
     if (!spooled_.finish()) {
@@ -144,6 +145,12 @@ std::optional<QString> FileBytes::readPipe()
     }
     view_ = spooled_.view();
     return std::nullopt;
+}
+
+void FileBytes::releasePiece(std::size_t begin, std::size_t end) const
+{
+    mapped_.release(begin, end);
+    spooled_.release(begin, end);
 }
 
 std::optional<InputError> FileBytes::lostBytes() const

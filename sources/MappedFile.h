@@ -24,6 +24,8 @@ public:
     /// Gives the memory of what stands before a byte back to the system: a large file that is read in one pass is then
     /// never in memory as a whole. What is read there again comes from the file again.
     void release(std::size_t end) const;
+    /// The same for what stands between two bytes, from the page of the first one to the one before the page of the second.
+    void release(std::size_t begin, std::size_t end) const;
 
 private:
     char *begin_ = nullptr;

@@ -1,5 +1,6 @@
 #include "MappedFile.h"
 
+#include <algorithm>
 #include <array>
 #include <csignal>
 #include <cstdint>
@@ -101,6 +102,15 @@ void MappedFile::release(std::size_t end) const
     const std::size_t whole = end / piece * piece;
     if (begin_ != nullptr && whole >= piece && end - whole < piece / 32) {
         madvise(begin_ + (whole - piece), piece, MADV_DONTNEED);
+    }
+}
+
+void MappedFile::release(std::size_t begin, std::size_t end) const
+{
+    const std::size_t first = begin / pageSize * pageSize;
+    const std::size_t last = std::min(end, size_) / pageSize * pageSize;
+    if (begin_ != nullptr && first < last) {
+        madvise(begin_ + first, last - first, MADV_DONTNEED);
     }
 }
 

@@ -20,6 +20,13 @@ bool isDigit(char character)
     return character >= '0' && character <= '9';
 }
 
+/// How many digits there are from a position on.
+std::size_t digitsAt(std::string_view text, std::size_t at)
+{
+    const std::size_t end = std::min(text.find_first_not_of("0123456789", at), text.size());
+    return end - at;
+}
+
 /// A number of digits and a point alone.
 bool parseUnsigned(std::string_view text, double &number)
 {
@@ -99,16 +106,18 @@ char upper(char character)
 
 } // namespace
 
-/// The plus of a station such as 12+345.678 goes; one in front is a sign.
+/// The plus of a station such as 12+345.678 goes; one in front is a sign. After it there are as many digits as stations have
+/// there: 1+5 would be 15 otherwise, where 1+005 may be meant.
 bool parseStation(std::string_view text, double &number)
 {
     text = trimmedBlanks(text);
     const std::size_t plus = text.find('+', 1);
     const std::size_t sign = !text.empty() && (text[0] == '-' || text[0] == '+') ? 1 : 0;
-    const bool grouped = plus != std::string_view::npos && plus > sign && plus + 1 < text.size() &&
+    const std::size_t digits = plus != std::string_view::npos ? digitsAt(text, plus + 1) : 0;
+    const bool grouped = plus != std::string_view::npos && plus > sign && (digits == 2 || digits == 3) &&
                          std::all_of(text.begin() + static_cast<std::ptrdiff_t>(sign),
                                      text.begin() + static_cast<std::ptrdiff_t>(plus), isDigit) &&
-                         isDigit(text[plus + 1]) && text.find_first_of("eE") == std::string_view::npos;
+                         text.find_first_of("eE") == std::string_view::npos;
     if (!grouped) {
         return parseNumber(text, number);
     }

@@ -6,7 +6,8 @@
 namespace kareport
 {
 
-/// A station as a number, or with a plus before its last digits, as 12+345.678 or -0+075.000: the plus is dropped.
+/// A station as a number, or with a plus before its last two or three whole digits, as 12+345.678, -0+075.000 or 123+45.67:
+/// the plus is dropped.
 bool parseStation(std::string_view text, double &number);
 
 /// An offset as a number, or with its side after it, as 12.5R or 3.2 L, in any case; to the left is below 0.

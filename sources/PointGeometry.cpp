@@ -61,7 +61,7 @@ private:
 
 QString noGeometry()
 {
-    return Xlate("bytes that are no geometry");
+    return Xlate("bytes that are not a geometry");
 }
 
 QString nameOfType(std::uint32_t type)

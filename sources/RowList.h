@@ -4,6 +4,9 @@
 #include "InputError.h"
 #include "UDataObjectList.h"
 
+#include <QString>
+#include <QStringList>
+
 #include <cstddef>
 #include <functional>
 #include <optional>
@@ -20,7 +23,7 @@ struct SourceColumns
 {
     QString source; ///< what messages call the source: its file, or a connection
     std::vector<SourceColumn> columns;
-    std::vector<unsigned> ids; ///< the identifiers that values are stored under
+    QStringList variables; ///< the names of the variables that are read, folded, each once
 };
 
 /// The rows of a data source as data objects, made while they are asked for in turn. When something is wrong with a row, or

@@ -9,6 +9,15 @@
 namespace kareport
 {
 
+namespace
+{
+
+/// Ends a sorting that nobody waits for any more.
+struct Stopped
+{};
+
+} // namespace
+
 RowObjectList::RowObjectList(std::unique_ptr<RowReader> reader, ReadProgress progress)
     : reader_(std::move(reader)), progress_(std::move(progress)), error_(endOfRows(reader_->error()))
 {}
@@ -46,7 +55,7 @@ std::optional<SourceColumns> RowObjectList::columns() const
     if (error_ || !reader_->knowsColumns()) {
         return std::nullopt;
     }
-    return SourceColumns{reader_->name(), reader_->columns(), reader_->ids()};
+    return SourceColumns{reader_->name(), reader_->columns(), reader_->variables()};
 }
 
 /// Goes back to the first row, with no batch read.
@@ -120,12 +129,24 @@ bool RowObjectList::readRow(RowBatch &batch, std::size_t &bytes)
     }
     endWideVectors();
     if (!reader_->next(batch.next(), nullptr)) {
-        batch.error = reader_->error();
+        batch.error = order_ ? firstError() : reader_->error();
         return false;
     }
     bytes += reader_->rowBytes();
     ++batch.count;
     return true;
+}
+
+/// What is wrong with the first row of the source that is wrong, which in a sorted list is not the first that is met: sorting
+/// has looked at the sort keys alone.
+std::optional<InputError> RowObjectList::firstError()
+{
+    const auto met = reader_->error();
+    reader_->rewind();
+    UDataObject object;
+    while (reader_->next(object, nullptr)) {
+    }
+    return reader_->error() ? reader_->error() : met;
 }
 
 bool RowObjectList::readFromSpool(RowBatch &batch, std::size_t &bytes)
@@ -165,13 +186,19 @@ std::vector<RowObjectList::Key> RowObjectList::keysOfPlaces(const std::vector<un
         key.place = reader_->place();
         keys.push_back(std::move(key));
         key.values.Clear();
-        if (progress_ && keys.size() % RowBatch::most == 0 && !progress_(reader_->position())) {
-            stopped_ = true;
+        if (keys.size() % RowBatch::most == 0 && isToStop(reader_->position())) {
             return keys;
         }
     }
     error_ = endOfRows(reader_->error());
     return keys;
+}
+
+/// Asks whether work is to stop. @param position  where reading has come to
+bool RowObjectList::isToStop(std::size_t position)
+{
+    stopped_ = stopped_ || (progress_ && !progress_(position));
+    return stopped_;
 }
 
 /// Reads all rows into a temporary file. @return false when work is to stop or something is wrong
@@ -215,11 +242,17 @@ std::vector<RowObjectList::Key> RowObjectList::keysOfSpooled(const std::vector<u
     };
     if (order_) {
         for (const RowPlace &place : *order_) {
+            if (keys.size() % RowBatch::most == 0 && isToStop(position_)) {
+                break;
+            }
             addKey(place.start);
         }
         return keys;
     }
     for (std::size_t place = 0; place < spool_->end();) {
+        if (keys.size() % RowBatch::most == 0 && isToStop(position_)) {
+            break;
+        }
         place = addKey(place);
     }
     return keys;
@@ -229,9 +262,18 @@ void RowObjectList::sortPlaces(const std::vector<Key> &keys, const std::vector<u
 {
     std::vector<std::size_t> order(keys.size());
     std::iota(order.begin(), order.end(), std::size_t(0));
-    std::stable_sort(order.begin(), order.end(), [&](std::size_t left, std::size_t right) {
-        return compareObjects(keys[left].values, keys[right].values, ids) < 0;
-    });
+    constexpr std::size_t comparisonsBetween = 1 << 16;
+    std::size_t comparisons = 0;
+    try {
+        std::stable_sort(order.begin(), order.end(), [&](std::size_t left, std::size_t right) {
+            if (++comparisons % comparisonsBetween == 0 && isToStop(position_)) {
+                throw Stopped();
+            }
+            return compareObjects(keys[left].values, keys[right].values, ids) < 0;
+        });
+    } catch (const Stopped &) {
+        return;
+    }
     order_.emplace();
     order_->reserve(order.size());
     for (const std::size_t index : order) {

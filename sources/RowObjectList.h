@@ -43,8 +43,10 @@ private:
     bool seekNext();
     bool readRow(RowBatch &batch, std::size_t &bytes);
     bool readFromSpool(RowBatch &batch, std::size_t &bytes);
+    std::optional<InputError> firstError();
     bool takeBatch();
     void poll();
+    bool isToStop(std::size_t position);
     std::vector<Key> keysOfPlaces(const std::vector<unsigned> &ids);
     std::vector<Key> keysOfSpooled(const std::vector<unsigned> &ids);
     bool spoolRows();

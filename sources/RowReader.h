@@ -59,6 +59,8 @@ public:
     virtual bool knowsColumns() const { return true; }
     /// The identifiers that values are stored under.
     virtual std::vector<unsigned> ids() const { return binding_.ids(); }
+    /// The names of the variables that are read, folded, each once.
+    virtual QStringList variables() const { return binding_.variables(); }
     /// What messages call the source: its file, or a connection.
     virtual QString name() const = 0;
     /// What is wrong with the columns that were chosen, where the data itself is not.

@@ -27,9 +27,21 @@ bool SpooledBytes::finish()
     if (!flush()) {
         return false;
     }
+    mapped_ = std::make_unique<MappedFile>();
+    if (mapped_->map(file_->handle(), written_)) {
+        view_ = mapped_->view();
+        return true;
+    }
     const auto *bytes = reinterpret_cast<const char *>(file_->map(0, static_cast<qint64>(written_)));
     view_ = {bytes, bytes != nullptr ? written_ : 0};
     return bytes != nullptr;
+}
+
+void SpooledBytes::release(std::size_t begin, std::size_t end) const
+{
+    if (mapped_) {
+        mapped_->release(begin, end);
+    }
 }
 
 QString SpooledBytes::wrong() const

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "MappedFile.h"
+
 #include <QString>
 #include <QTemporaryFile>
 
@@ -33,6 +35,9 @@ public:
     bool finish();
     /// All bytes, after `finish`.
     std::string_view view() const { return view_; }
+    /// Gives the memory of what stands between two bytes back to the system. What is read there again comes from the
+    /// temporary file.
+    void release(std::size_t begin, std::size_t end) const;
     /// What is wrong with the temporary file.
     QString wrong() const;
 
@@ -43,6 +48,7 @@ private:
 
     std::string buffer_;
     std::unique_ptr<QTemporaryFile> file_;
+    std::unique_ptr<MappedFile> mapped_;
     std::size_t written_ = 0;
     std::string_view view_;
 };

@@ -57,6 +57,7 @@ public:
 
     bool hasMark() const { return encoding_ != TextEncoding::Utf16 || hasMark_; }
     bool atEnd() const { return at_ >= bytes_.size(); }
+    std::size_t position() const { return at_; }
 
     /// The next character; nothing when the bytes are none.
     std::optional<char32_t> next()
@@ -107,7 +108,7 @@ QString wrongCharacter(TextEncoding encoding)
 {
     return encoding == TextEncoding::Utf16
                ? Xlate("the file is not UTF-16")
-               : Xlate("the file is not Windows-1252: it has a byte that is no character there");
+               : Xlate("the file is not Windows-1252: it has a byte that stands for no character");
 }
 
 } // namespace
@@ -128,7 +129,8 @@ std::optional<TextEncoding> textEncodingFromKey(QStringView key)
     return found != std::end(keys) ? std::optional(found->encoding) : std::nullopt;
 }
 
-Expected<std::shared_ptr<const FileBytes>> toUtf8(std::shared_ptr<const FileBytes> file, TextEncoding encoding)
+Expected<std::shared_ptr<const FileBytes>> toUtf8(std::shared_ptr<const FileBytes> file, TextEncoding encoding,
+                                                  const std::function<bool()> &isToStop)
 {
     if (encoding == TextEncoding::Utf8) {
         return file;
@@ -140,7 +142,15 @@ Expected<std::shared_ptr<const FileBytes>> toUtf8(std::shared_ptr<const FileByte
     }
     SpooledBytes spooled;
     TextPlace place;
-    while (!reader.atEnd()) {
+    std::size_t released = 0;
+    constexpr std::size_t charactersBetween = 1 << 16;
+    for (std::size_t read = 1; !reader.atEnd(); ++read) {
+        if (read % charactersBetween == 0) {
+            if (isToStop && isToStop()) {
+                return std::shared_ptr<const FileBytes>();
+            }
+            file->releaseBefore(reader.position(), released);
+        }
         const auto character = reader.next();
         if (!character) {
             const auto lost = file->lostBytes();

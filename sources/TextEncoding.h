@@ -5,6 +5,7 @@
 
 #include <QStringView>
 
+#include <functional>
 #include <memory>
 #include <optional>
 
@@ -25,7 +26,9 @@ std::optional<TextEncoding> textEncodingFromKey(QStringView key);
 
 /// The bytes of a text file as UTF-8; lines and columns are the same. A text that is UTF-8 already is handed back as it is; its
 /// characters are not looked at. Any other is read as a whole, into a temporary file when it is large.
+/// @param isToStop  is asked now and then; its true ends the reading, and nothing comes back. May be empty
 /// @return an error with its place where a character is none of the encoding
-Expected<std::shared_ptr<const FileBytes>> toUtf8(std::shared_ptr<const FileBytes> file, TextEncoding encoding);
+Expected<std::shared_ptr<const FileBytes>> toUtf8(std::shared_ptr<const FileBytes> file, TextEncoding encoding,
+                                                  const std::function<bool()> &isToStop = {});
 
 } // namespace kareport

@@ -25,6 +25,9 @@ public:
     /// Says how the numbers of the texts are written. Angles have no thousands.
     void setNumberStyle(const NumberStyle &style);
 
+    /// Whether every text fits the type.
+    bool takesAnyText() const { return form_ == Form::Text || form_ == Form::PointNumber; }
+
     /// Whether a text stands for no value: an empty one, and blanks where a text is not what is wanted.
     bool isNone(std::string_view text) const
     {

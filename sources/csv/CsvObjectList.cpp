@@ -9,7 +9,7 @@ namespace kareport
 namespace
 {
 
-/// No rows, for the reason that stands in `error`.
+/// No rows, for the reason that `error` gives.
 class FailedRows : public RowReader
 {
 public:
@@ -22,6 +22,23 @@ public:
     std::size_t rowBytes() const override { return 0; }
 };
 
+/// No rows, as reading was stopped before the first one.
+class StoppedRows : public RowReader
+{
+public:
+    explicit StoppedRows(const QString &name) : name_(name) {}
+
+    bool next(UDataObject & /*object*/, const std::vector<unsigned> * /*onlyIds*/) override { return false; }
+    void rewind() override {}
+    QString name() const override { return name_; }
+    bool knowsColumns() const override { return false; }
+    std::size_t position() const override { return 0; }
+    std::size_t rowBytes() const override { return 0; }
+
+private:
+    QString name_;
+};
+
 CsvDialect withDelimiter(char delimiter)
 {
     CsvDialect dialect;
@@ -30,21 +47,27 @@ CsvDialect withDelimiter(char delimiter)
 }
 
 std::unique_ptr<RowReader> makeReader(const std::shared_ptr<const FileBytes> &file, const CsvDialect &dialect,
-                                      const Variables &variables)
+                                      const Variables &variables, const ReadProgress &progress)
 {
-    const auto text = toUtf8(file, dialect.encoding);
+    const auto text = toUtf8(file, dialect.encoding, [&progress] { return progress && !progress(0); });
     if (const InputError *error = errorOf(text)) {
         return std::make_unique<FailedRows>(*error);
     }
     const auto &bytes = std::get<std::shared_ptr<const FileBytes>>(text);
-    if (dialect.kind != DelimiterKind::Automatic) {
-        return std::make_unique<CsvRows>(bytes, dialect, variables);
+    if (!bytes) {
+        return std::make_unique<StoppedRows>(file->path());
     }
-    const auto guessed = guessDelimiter(bytes, dialect, variables);
-    if (const InputError *error = errorOf(guessed)) {
-        return std::make_unique<FailedRows>(*error);
+    CsvDialect known = dialect;
+    if (dialect.kind == DelimiterKind::Automatic) {
+        const auto guessed = guessDelimiter(bytes, dialect, variables);
+        if (const InputError *error = errorOf(guessed)) {
+            return std::make_unique<FailedRows>(*error);
+        }
+        known = std::get<CsvDialect>(guessed);
     }
-    return std::make_unique<CsvRows>(bytes, std::get<CsvDialect>(guessed), variables);
+    auto rows = std::make_unique<CsvRows>(bytes, known, variables);
+    rows->checkHeader();
+    return rows;
 }
 
 } // namespace
@@ -56,8 +79,8 @@ CsvObjectList::CsvObjectList(std::shared_ptr<const FileBytes> file, char delimit
 {}
 
 CsvObjectList::CsvObjectList(const std::shared_ptr<const FileBytes> &file, const CsvDialect &dialect,
-                             const Variables &variables, ReadProgress progress)
-    : RowObjectList(makeReader(file, dialect, variables), std::move(progress))
+                             const Variables &variables, const ReadProgress &progress)
+    : RowObjectList(makeReader(file, dialect, variables, progress), progress)
 {}
 
 } // namespace kareport

@@ -19,7 +19,7 @@ public:
                   ReadProgress progress);
     /// Reads what comes before the rows of a file of any dialect.
     CsvObjectList(const std::shared_ptr<const FileBytes> &file, const CsvDialect &dialect, const Variables &variables,
-                  ReadProgress progress);
+                  const ReadProgress &progress);
 };
 
 } // namespace kareport

@@ -56,6 +56,8 @@ public:
 
     /// The place of a cell of the row; after the last one, that of the last.
     TextPlace placeOfCell(std::size_t cell) const;
+    /// The places of all cells of the row.
+    std::vector<TextPlace> placesOfCells() const;
     InputError errorAt(TextPlace place, const QString &text) const { return {path_, place, text}; }
 
 private:
@@ -88,6 +90,8 @@ private:
     bool passesLines_; ///< comments or blank lines
     std::size_t position_ = 0;
     std::size_t rowStart_ = 0;
+    std::size_t blankFrom_ = 1; ///< from here to `blankEnd_` there are blanks and line ends alone
+    std::size_t blankEnd_ = 0;  // nothing was looked over yet
     qsizetype line_ = 1;
     qsizetype rowLine_ = 1;
     bool hasHighBytes_ = false;

@@ -41,9 +41,13 @@ void CsvReader::passOverLine()
 /// Blank lines at the end of the file are no rows.
 bool CsvReader::skipEmptyEnd()
 {
-    const char *blank = layout_.whitespace ? " \t\r\n" : "\r\n";
-    const std::size_t text = bytes_.find_first_not_of(blank, position_);
-    if (text == std::string_view::npos) {
+    // What was looked over once is not looked over again for each of its lines.
+    if (position_ < blankFrom_ || position_ > blankEnd_) {
+        const char *blank = layout_.whitespace ? " \t\r\n" : "\r\n";
+        blankFrom_ = position_;
+        blankEnd_ = std::min(bytes_.find_first_not_of(blank, position_), bytes_.size());
+    }
+    if (blankEnd_ == bytes_.size()) {
         position_ = bytes_.size();
     }
     return position_ == bytes_.size();
@@ -67,6 +71,26 @@ TextPlace CsvReader::placeOfCell(std::size_t cell) const
     }
     const RawCell &raw = rawCells_[std::min(cell, rawCells_.size() - 1)];
     return placeOf(raw.quoted ? raw.begin - 1 : raw.begin);
+}
+
+std::vector<TextPlace> CsvReader::placesOfCells() const
+{
+    std::vector<TextPlace> places;
+    places.reserve(rawCells_.size());
+    TextPlace place = {rowLine_, 1};
+    std::size_t at = rowStart_;
+    for (const RawCell &raw : rawCells_) {
+        for (const std::size_t begin = raw.quoted ? raw.begin - 1 : raw.begin; at < begin; ++at) {
+            const auto byte = static_cast<unsigned char>(bytes_[at]);
+            if (byte == '\n') {
+                place = {place.line + 1, 1};
+            } else if ((byte & 0xC0U) != 0x80U) {
+                ++place.column;
+            }
+        }
+        places.push_back(place);
+    }
+    return places;
 }
 
 } // namespace kareport

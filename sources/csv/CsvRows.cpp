@@ -60,8 +60,15 @@ CsvRows::CsvRows(std::shared_ptr<const FileBytes> file, const CsvDialect &dialec
     if (!readColumns(dialect) || !bindColumns(dialect, variables)) {
         return;
     }
+    if (dialect.hasHeader && holdsValues(dialect)) {
+        headerIsData_ = reader_.errorAt(
+            reader_.placeOfCell(0),
+            Xlate(
+                "the header row holds values that fit the columns, and would be lost if it is data: \"header\": false "
+                "(--no-header) was expected, with \"skip\" for lines that are not data"));
+    }
     firstRow_ = dialect.hasHeader ? RowPlace{reader_.position(), reader_.nextLine()} : start;
-    seek(firstRow_);
+    rewind();
 }
 
 /// Reads the first row, which names the columns or tells how many there are. @return false when something is wrong with it
@@ -69,10 +76,11 @@ bool CsvRows::readColumns(const CsvDialect &dialect)
 {
     const auto names = dialect.names.isEmpty() ? namesOfOrder(dialect.order) : std::optional(dialect.names);
     if (!names && !dialect.order.isEmpty()) {
-        wrongChoice_ = ColumnFault{std::nullopt, QString(),
-                                   Xlate("\"%1\" is no order of columns: each of the letters P, N, E, Z and D at most "
-                                         "once, and - for a column that is passed over, was expected, such as PNEZD")
-                                       .arg(dialect.order)};
+        wrongChoice_ =
+            ColumnFault{std::nullopt, QString(),
+                        Xlate("\"%1\" is not an order of columns: each of the letters P, N, E, Z and D at most "
+                              "once, and - for a column that is passed over, was expected, such as PNEZD")
+                            .arg(dialect.order)};
         error_ = InputError{file_->path(), std::nullopt, wrongChoice_->text};
         return false;
     }
@@ -85,11 +93,12 @@ bool CsvRows::readColumns(const CsvDialect &dialect)
         return false;
     }
     width_ = names ? static_cast<std::size_t>(names->size()) : reader_.cells().size();
+    const std::vector<TextPlace> places = isNamed_ ? reader_.placesOfCells() : std::vector<TextPlace>();
     for (std::size_t i = 0; i < width_; ++i) {
         SourceColumn &column = columns_.emplace_back();
         if (isNamed_) {
             column.name = nameIn(reader_.cells()[i]);
-            column.place = reader_.placeOfCell(i);
+            column.place = places[i];
         } else if (names) {
             column.name = (*names)[static_cast<qsizetype>(i)];
         }
@@ -131,6 +140,39 @@ bool CsvRows::bindColumns(const CsvDialect &dialect, const Variables &variables)
     return true;
 }
 
+/// Whether the row that was read last has values of the variables instead of their names. A row of texts alone may be either.
+bool CsvRows::holdsValues(const CsvDialect &dialect) const
+{
+    const auto &cells = reader_.cells();
+    // A column that is read by the name in the row tells that there are names.
+    const auto chosenByNumber =
+        std::count_if(dialect.columns.begin(), dialect.columns.end(),
+                      [](const ColumnChoice &choice) { return std::holds_alternative<int>(choice.column); });
+    if (cells.size() != width_ || (isNamed_ && chosenByNumber != std::ssize(binding_.fields()))) {
+        return false;
+    }
+    UDataObject object;
+    bool hasNumber = false;
+    for (const BoundField &field : binding_.fields()) {
+        const std::string_view cell = cells[field.column];
+        if (field.parser.isNone(cell)) {
+            continue;
+        }
+        if (!field.parser.storeValue(cell, object)) {
+            return false;
+        }
+        hasNumber = hasNumber || !field.parser.takesAnyText();
+    }
+    return hasNumber;
+}
+
+void CsvRows::checkHeader()
+{
+    if (!error_) {
+        error_ = headerIsData_;
+    }
+}
+
 void CsvRows::failWithoutVariable()
 {
     error_ = isNamed_
@@ -146,6 +188,13 @@ void CsvRows::seek(const RowPlace &place)
 {
     reader_.seek(place.start, place.line);
     error_.reset();
+    released_ = file_->view().size(); // rows in another order come back to what was read
+}
+
+void CsvRows::rewind()
+{
+    seek(firstRow_);
+    released_ = 0;
 }
 
 bool CsvRows::next(UDataObject &object, const std::vector<unsigned> *onlyIds)
@@ -171,6 +220,7 @@ bool CsvRows::next(UDataObject &object, const std::vector<unsigned> *onlyIds)
             return failInCell(field);
         }
     }
+    file_->releaseBefore(reader_.rowStart(), released_);
     return true;
 }
 

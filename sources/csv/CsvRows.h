@@ -15,9 +15,11 @@ class CsvRows : public RowReader
 public:
     /// Reads what comes before the rows.
     CsvRows(std::shared_ptr<const FileBytes> file, const CsvDialect &dialect, const Variables &variables);
+    /// Fails where the header row would be passed over although it is data: the first point would be lost.
+    void checkHeader();
 
     bool next(UDataObject &object, const std::vector<unsigned> *onlyIds) override;
-    void rewind() override { seek(firstRow_); }
+    void rewind() override;
     std::size_t position() const override { return reader_.position(); }
     std::size_t rowBytes() const override { return reader_.position() - reader_.rowStart(); }
     std::optional<InputError> lostBytes() const override { return file_->lostBytes(); }
@@ -29,15 +31,18 @@ public:
 private:
     bool readColumns(const CsvDialect &dialect);
     bool bindColumns(const CsvDialect &dialect, const Variables &variables);
+    bool holdsValues(const CsvDialect &dialect) const;
     void failWithoutVariable();
     bool failWithCells();
     bool failInCell(const BoundField &field);
 
     std::shared_ptr<const FileBytes> file_;
     CsvReader reader_;
-    bool isNamed_;          ///< the header row names the columns
-    std::size_t width_ = 0; ///< cells of every row
+    bool isNamed_;                           ///< the header row names the columns
+    std::optional<InputError> headerIsData_; ///< says that the header row has values instead of names
+    std::size_t width_ = 0;                  ///< cells of every row
     RowPlace firstRow_;
+    std::size_t released_ = 0; ///< up to where memory was given back
 };
 
 /// The layout of a dialect whose delimiter is known.

@@ -82,6 +82,67 @@ bool knowsMore(const Reading &left, const Reading &right)
            std::includes(left.ids.begin(), left.ids.end(), right.ids.begin(), right.ids.end());
 }
 
+/// A delimiter that the first rows cannot be read with.
+struct Failure
+{
+    CsvDialect dialect;
+    InputError error;
+    bool isSplit;    ///< the first row has several cells
+    bool hasColumns; ///< the columns could be found, so that a row is wrong
+};
+
+/// What was tried.
+struct Trials
+{
+    std::vector<Reading> possible;
+    std::vector<Failure> failures;
+    bool hasRow = false;
+};
+
+/// The only failure that a condition holds for; null when it holds for none, or for several.
+template <typename Condition>
+const Failure *onlyFailure(const std::vector<Failure> &failures, const Condition &condition)
+{
+    const auto found = std::find_if(failures.begin(), failures.end(), condition);
+    const bool isOnly = found != failures.end() && std::none_of(found + 1, failures.end(), condition);
+    return isOnly ? &*found : nullptr;
+}
+
+/// A dialect that says itself what is wrong with the file, where one cause is clear; null where none is.
+const CsvDialect *clearlyWrong(const std::vector<Failure> &failures)
+{
+    if (const Failure *only = onlyFailure(failures, [](const Failure &one) { return one.hasColumns; })) {
+        return &only->dialect;
+    }
+    if (std::any_of(failures.begin(), failures.end(), [](const Failure &one) { return one.hasColumns; })) {
+        return nullptr;
+    }
+    if (const Failure *only = onlyFailure(failures, [](const Failure &one) { return one.isSplit; })) {
+        return &only->dialect;
+    }
+    // What is wrong with any delimiter has nothing to do with it.
+    const bool isSame = !failures.empty() && std::all_of(failures.begin(), failures.end(), [&](const Failure &one) {
+        return one.error.message() == failures.front().error.message();
+    });
+    return isSame ? &failures.front().dialect : nullptr;
+}
+
+InputError noneIsPossible(const QString &path, const std::vector<Failure> &failures)
+{
+    QString text = Xlate("the delimiter cannot be found out: with a comma, a semicolon, a tab, a vertical bar, or "
+                         "blanks and tabs, the first rows do not have the same number of cells that fit their "
+                         "variables. The delimiter itself was expected");
+    for (const Failure &failure : failures) {
+        if (failure.hasColumns) {
+            const auto &place = failure.error.place;
+            text += QStringLiteral("; ") +
+                    Xlate("with %1, in line %2: %3")
+                        .arg(nameOf(failure.dialect), QString::number(place ? place->line : 1), failure.error.text);
+        }
+    }
+    return {path, std::nullopt, text};
+}
+
 /// The only reading that is possible.
 Expected<CsvDialect> only(const QString &path, const std::vector<Reading> &possible)
 {
@@ -97,14 +158,31 @@ Expected<CsvDialect> only(const QString &path, const std::vector<Reading> &possi
     for (const Reading &reading : readings) {
         names.append(nameOf(reading.dialect));
     }
-    return InputError{
-        path, std::nullopt,
-        readings.empty()
-            ? Xlate("the delimiter cannot be found out: with a comma, a semicolon, a tab, a vertical bar, or "
-                    "blanks and tabs, the first rows do not have the same number of cells that fit their "
-                    "variables. The delimiter itself was expected")
-            : Xlate("the delimiter cannot be found out: it may be %1. The delimiter itself was expected")
-                  .arg(names.join(Xlate(" or @@between two delimiters")))};
+    return InputError{path, std::nullopt,
+                      Xlate("the delimiter cannot be found out: it may be %1. The delimiter itself was expected")
+                          .arg(names.join(Xlate(" or @@between two delimiters")))};
+}
+
+/// Reads the first rows with a delimiter.
+void tryDelimiter(const std::shared_ptr<const FileBytes> &file, const CsvDialect &dialect, const Variables &variables,
+                  Trials &trials)
+{
+    CsvRows rows(file, dialect, variables);
+    Cells cells = firstCells(*file, dialect);
+    trials.hasRow = trials.hasRow || !cells.empty();
+    const bool isSplit = !cells.empty() && cells.front().size() > 1;
+    const bool hasColumns = !rows.error() && isSplit;
+    if (hasColumns && readFirstRows(rows)) {
+        std::vector<unsigned> ids = rows.ids();
+        std::sort(ids.begin(), ids.end());
+        const bool isSame = std::any_of(trials.possible.begin(), trials.possible.end(),
+                                        [&](const Reading &other) { return other.cells == cells; });
+        if (!isSame) {
+            trials.possible.push_back({dialect, std::move(ids), std::move(cells)});
+        }
+    } else if (rows.error()) {
+        trials.failures.push_back({dialect, *rows.error(), isSplit, hasColumns});
+    }
 }
 
 } // namespace
@@ -122,32 +200,24 @@ Expected<CsvDialect> guessDelimiter(const std::shared_ptr<const FileBytes> &file
     if (!areColumnsChosenWell(dialect, variables)) {
         return known; // no delimiter makes that right
     }
-    std::vector<Reading> possible;
-    std::vector<CsvDialect> withColumns;
+    Trials trials;
     for (const Candidate &candidate : candidates) {
-        if (isMark(candidate, dialect.numbers)) {
-            continue;
-        }
-        known.kind = candidate.kind;
-        known.delimiter = candidate.delimiter;
-        CsvRows rows(file, known, variables);
-        Cells cells = firstCells(*file, known);
-        if (rows.error() || cells.empty() || cells.front().size() < 2) {
-            continue;
-        }
-        withColumns.push_back(known);
-        std::vector<unsigned> ids = rows.ids();
-        std::sort(ids.begin(), ids.end());
-        const bool isSame =
-            std::any_of(possible.begin(), possible.end(), [&](const Reading &other) { return other.cells == cells; });
-        if (readFirstRows(rows) && !isSame) {
-            possible.push_back({known, std::move(ids), std::move(cells)});
+        if (!isMark(candidate, dialect.numbers)) {
+            known.kind = candidate.kind;
+            known.delimiter = candidate.delimiter;
+            tryDelimiter(file, known, variables, trials);
         }
     }
-    if (possible.empty() && withColumns.size() == 1) {
-        return withColumns.front(); // it says itself what is wrong with a row
+    if (!trials.possible.empty()) {
+        return only(file->path(), trials.possible);
     }
-    return only(file->path(), possible);
+    if (const CsvDialect *wrong = clearlyWrong(trials.failures)) {
+        return *wrong; // it says itself what is wrong
+    }
+    if (!trials.hasRow && trials.failures.empty()) {
+        return known; // without a row, any delimiter does
+    }
+    return noneIsPossible(file->path(), trials.failures);
 }
 
 } // namespace kareport

@@ -1,6 +1,5 @@
 #include "JsonFileRows.h"
 
-#include "NumberText.h"
 #include "Xlate.h"
 
 #include <algorithm>
@@ -12,11 +11,6 @@ namespace
 {
 
 constexpr std::string_view byteOrderMark = "\xEF\xBB\xBF";
-
-QString textOf(std::string_view text)
-{
-    return QString::fromUtf8(text.data(), static_cast<qsizetype>(text.size()));
-}
 
 QString wanted()
 {
@@ -41,13 +35,22 @@ JsonFileRows::JsonFileRows(std::shared_ptr<const FileBytes> file, const std::vec
     }
 }
 
+/// Where the text begins, after a byte-order mark.
+std::size_t JsonFileRows::start() const
+{
+    return text_.starts_with(byteOrderMark) ? byteOrderMark.size() : 0;
+}
+
 void JsonFileRows::rewind()
 {
     if (wrongChoice_) {
         return;
     }
-    position_ = text_.starts_with(byteOrderMark) ? byteOrderMark.size() : 0;
+    position_ = start();
     line_ = 1;
+    knownAt_ = position_;
+    knownPlace_ = TextPlace();
+    released_ = 0;
     before_ = Before::First;
     row_ = {};
     error_.reset();
@@ -59,6 +62,7 @@ void JsonFileRows::seek(const RowPlace &place)
     line_ = place.line;
     before_ = Before::Object;
     error_.reset();
+    released_ = text_.size(); // rows in another order come back to what was read
 }
 
 /// Goes over blanks. @return whether there was a line end
@@ -104,7 +108,7 @@ bool JsonFileRows::findObject()
             return endRows();
         }
         if (!isList_ && !isNewLine) {
-            return fail(position_, Xlate("the end of the line was expected: each object stands in a line of its own"));
+            return fail(position_, Xlate("the end of the line was expected: each object has a line of its own"));
         }
         if (isList_) {
             ++position_;
@@ -154,93 +158,8 @@ bool JsonFileRows::next(UDataObject &object, const std::vector<unsigned> *onlyId
     const std::string_view row = text_.substr(row_.start, position_ - row_.start);
     line_ += std::count(row.begin(), row.end(), '\n');
     before_ = Before::Rest;
+    file_->releaseBefore(row_.start, released_);
     return true;
-}
-
-bool JsonFileRows::onKey(std::string_view key, std::size_t end)
-{
-    valueStart_ = end;
-    keyStart_ = startOfKey(end);
-    const auto found = keys_.take(key, rowNumber_);
-    fields_ = found.fields;
-    if (found.isNew && columns_.size() < JsonKeys::most) {
-        columns_.push_back({textOf(key), placeOf(keyStart_), !found.fields->empty()});
-    }
-    if (found.isRepeated) {
-        return fail(keyStart_, Xlate("the key \"%1\" stands twice in an object").arg(textOf(key)));
-    }
-    return !found.isVariableRepeated ||
-           fail(keyStart_, Xlate("the variable \"%1\" stands twice: each variable was expected once").arg(textOf(key)));
-}
-
-/// Where the key begins that ends at a position, with its opening quote.
-std::size_t JsonFileRows::startOfKey(std::size_t end) const
-{
-    std::size_t at = end - 2;
-    const auto isEscaped = [this](std::size_t quote) {
-        const std::size_t other = text_.find_last_not_of('\\', quote - 1);
-        return (quote - other) % 2 == 0;
-    };
-    while (text_[at] != '"' || isEscaped(at)) {
-        --at;
-    }
-    return at;
-}
-
-bool JsonFileRows::isWanted(unsigned id) const
-{
-    return onlyIds_ == nullptr || std::find(onlyIds_->begin(), onlyIds_->end(), id) != onlyIds_->end();
-}
-
-/// Stores the value of the key for the variables that are read from it.
-bool JsonFileRows::storeAll(const std::function<bool(const ValueParser &)> &store)
-{
-    for (const JsonKeys::Field &field : *fields_) {
-        if (isWanted(field.parser.id()) && !store(field.parser)) {
-            return failInValue(field);
-        }
-    }
-    return true;
-}
-
-bool JsonFileRows::onBoolean(bool value)
-{
-    return storeAll([&](const ValueParser &parser) { return parser.storeBoolean(value, *object_); });
-}
-
-bool JsonFileRows::onInteger(qint64 value)
-{
-    return storeAll([&](const ValueParser &parser) { return parser.storeInteger(value, *object_); });
-}
-
-bool JsonFileRows::onNumber(double value)
-{
-    return storeAll([&](const ValueParser &parser) { return parser.storeNumber(value, *object_); });
-}
-
-bool JsonFileRows::onText(std::string_view text)
-{
-    return storeAll([&](const ValueParser &parser) { return isPlainText(text) && parser.store(text, *object_); });
-}
-
-bool JsonFileRows::onNested()
-{
-    return storeAll([](const ValueParser &) { return false; });
-}
-
-void JsonFileRows::onMistake(const QString &text, std::size_t at)
-{
-    fail(at > row_.start ? at - 1 : at, Xlate("this is no JSON: %1").arg(text));
-}
-
-bool JsonFileRows::failInValue(const JsonKeys::Field &field)
-{
-    std::size_t at = valueStart_;
-    while (at < text_.size() && std::string_view(" \t\r\n:").find(text_[at]) != std::string_view::npos) {
-        ++at;
-    }
-    return fail(at,
-                Xlate("the value of \"%1\" does not fit: %2 was expected").arg(field.name, field.parser.expected()));
 }
 
 bool JsonFileRows::fail(std::size_t at, const QString &text)
@@ -249,21 +168,22 @@ bool JsonFileRows::fail(std::size_t at, const QString &text)
     return false;
 }
 
-/// The place of a position that is not before the row.
-TextPlace JsonFileRows::placeOf(std::size_t at) const
+/// The place of a byte. It is counted on from the one that was asked for last: a file of one line may have thousands of keys.
+TextPlace JsonFileRows::placeOf(std::size_t at)
 {
-    const std::string_view before = text_.substr(0, at);
-    const std::size_t lineEnd = before.rfind('\n');
-    std::string_view line = before.substr(lineEnd == std::string_view::npos ? 0 : lineEnd + 1);
-    if (line.starts_with(byteOrderMark)) {
-        line.remove_prefix(byteOrderMark.size());
+    if (at < knownAt_) {
+        knownAt_ = start();
+        knownPlace_ = TextPlace();
     }
-    // Lines are known up to where reading has come to, or to where the row begins.
-    const std::size_t known = std::min(row_.start, at);
-    const auto lines = std::count(before.begin() + static_cast<std::ptrdiff_t>(known), before.end(), '\n');
-    const auto characters = std::count_if(line.begin(), line.end(),
-                                          [](char byte) { return (static_cast<unsigned char>(byte) & 0xC0) != 0x80; });
-    return {row_.line + lines, characters + 1};
+    for (; knownAt_ < at; ++knownAt_) {
+        const auto byte = static_cast<unsigned char>(text_[knownAt_]);
+        if (byte == '\n') {
+            knownPlace_ = {knownPlace_.line + 1, 1};
+        } else if ((byte & 0xC0U) != 0x80U) {
+            ++knownPlace_.column;
+        }
+    }
+    return knownPlace_;
 }
 
 } // namespace kareport

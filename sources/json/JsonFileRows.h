@@ -31,6 +31,7 @@ public:
     QString name() const override { return file_->path(); }
     bool knowsColumns() const override { return isComplete_; }
     std::vector<unsigned> ids() const override { return keys_.ids(); }
+    QStringList variables() const override { return keys_.variables(); }
     bool canSeek() const override { return true; }
     RowPlace place() const override { return row_; }
     void seek(const RowPlace &place) override;
@@ -51,8 +52,9 @@ private:
     bool isWanted(unsigned id) const;
     bool fail(std::size_t at, const QString &text);
     bool failInValue(const JsonKeys::Field &field);
+    std::size_t start() const;
     std::size_t startOfKey(std::size_t end) const;
-    TextPlace placeOf(std::size_t at) const;
+    TextPlace placeOf(std::size_t at);
 
     bool onKey(std::string_view key, std::size_t end) override;
     bool onNull() override { return true; }
@@ -73,6 +75,9 @@ private:
     bool isList_ = false;
     bool isComplete_ = false; ///< the end was seen, and so every key
     RowPlace row_;
+    std::size_t knownAt_ = 0; ///< a byte whose place is known
+    TextPlace knownPlace_;
+    std::size_t released_ = 0;  ///< up to where memory was given back
     std::size_t rowNumber_ = 0; ///< counts every row that is read, also again
 
     // Of the row that is read.

@@ -52,6 +52,8 @@ public:
 
     /// The identifiers of the variables that are read, each once.
     const std::vector<unsigned> &ids() const { return ids_; }
+    /// The names of these variables, folded.
+    const QStringList &variables() const { return names_; }
 
 private:
     struct Key

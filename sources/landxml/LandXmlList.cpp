@@ -1,6 +1,7 @@
 #include "LandXmlList.h"
 
 #include "EntryOrder.h"
+#include "TextFolding.h"
 #include "Xlate.h"
 
 #include <algorithm>
@@ -191,7 +192,7 @@ std::optional<SourceColumns> LandXmlList::columns() const
     }
     for (const Column &column : columns_) {
         found.columns[column.variable].isKnown = true;
-        found.ids.push_back(column.parser.id());
+        found.variables.append(foldedKey(names_[column.variable]));
     }
     return found;
 }

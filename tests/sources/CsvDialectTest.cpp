@@ -97,7 +97,10 @@ TEST(CsvDialect, BlanksAndTabsDelimit)
          "Number Northing\n1 \"2\n",
          {"error 2:3 the quoted cell has no closing quote"},
          "a quote that is not closed"},
-        {spaced(), QByteArray("Number Northing\n1 2\0\n", 21), {"error 2:4 a zero byte"}, "a zero byte"},
+        {spaced(),
+         QByteArray("Number Northing\n1 2\0\n", 21),
+         {"error 2:4 the file contains a zero byte"},
+         "a zero byte"},
         {spaced(), "Number Northing\n1 \xFF\n", {"error 2:3 the file is not UTF-8"}, "a byte that is no character"},
         {spaced(),
          "Number Northing\n1 " + QByteArray(1 << 20, '2') + "\n",
@@ -135,8 +138,8 @@ TEST(CsvDialect, AnOrderNamesTheColumns)
          "a header row that nobody told of"},
         {ordered("PNEZD"), "", {}, "no row"},
         {ordered("P-"), "1,2\n", {"number=1"}, "one of two"},
-        {ordered("PP"), "1,2\n", {"error \"PP\" is no order of columns"}, "a letter twice"},
-        {ordered("PNX"), "1,2,3\n", {"error \"PNX\" is no order of columns"}, "another letter"},
+        {ordered("PP"), "1,2\n", {"error \"PP\" is not an order of columns"}, "a letter twice"},
+        {ordered("PNX"), "1,2,3\n", {"error \"PNX\" is not an order of columns"}, "another letter"},
         {ordered("---"), "1,2,3\n", {"error no column is a variable"}, "nothing is read"},
         {ordered("P-", {{"Count", 2}}), "1,2\n", {"number=1 count=2"}, "a column of the rest is chosen"},
         {ordered("PZ", {{"Station", 2}}), "1,2\n", {"number=1 station=2"}, "a column is chosen for another variable"},
@@ -152,7 +155,29 @@ TEST(CsvDialect, AnOrderNamesTheColumns)
     CsvDialect withHeader = ordered("PN");
     withHeader.hasHeader = true;
     check({{withHeader, "Northing,Number\n1,2\n", {"number=1 northing=2"}, "a header row is passed over"},
-           {withHeader, "", {"error 1:1 a header row was expected"}, "a header row is missing"}});
+           {withHeader, "", {"error 1:1 a header row was expected"}, "a header row is missing"},
+           {withHeader,
+            "1,2\n2,3\n",
+            {"error 1:1 the header row holds values that fit the columns"},
+            "the first point would be lost"},
+           {withHeader, ",2\n2,3\n", {"error 1:1 the header row holds values"}, "also where it lacks a text"},
+           {withHeader, "1,\n2,3\n", {"number=2 northing=3"}, "a row without a number may be one of names"}});
+    CsvDialect texts = ordered("PD");
+    texts.hasHeader = true;
+    CsvDialect list;
+    list.names.append(QStringLiteral("Number"));
+    list.names.append(QStringLiteral("Northing"));
+    CsvDialect found = withHeader;
+    found.kind = DelimiterKind::Automatic;
+    check({{texts, "1,a\n2,b\n", {"number=2 description=b"}, "texts may be names"},
+           {list, "1,2\n2,3\n", {"error 1:1 the header row holds values"}, "a list of names"},
+           {list, "Pt,North\n2,3\n", {"number=2 northing=3"}, "a list of names and a header row"},
+           {found, "1;2\n2;3\n", {"error 1:1 the header row holds values"}, "with a delimiter that is found out"},
+           {chosen({{"Number", 1}, {"Northing", 2}}),
+            "1,2\n2,3\n",
+            {"error 1:1 the header row holds values"},
+            "numbers of columns"},
+           {chosen({{"Elevation", 2}}), "Number,2020\n1,2\n", {"number=1 elevation=2"}, "a name is read as one"}});
 }
 
 TEST(CsvDialect, ColumnsAreChosen)

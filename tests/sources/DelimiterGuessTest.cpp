@@ -60,6 +60,8 @@ TEST(DelimiterGuess, SaysWhatCannotBeFoundOut)
     };
     CsvDialect misspelt = automatic();
     misspelt.columns = {{QStringLiteral("Elev"), 1}};
+    CsvDialect absent = automatic();
+    absent.columns = {{QStringLiteral("Elevation"), QStringLiteral("Elv")}};
     const Row rows[] = {
         {automatic("PD"), "A B,C\n", "it may be the comma or blanks and tabs", "two readings"},
         {automatic("PD"), "1, 2\n", "it may be the comma or blanks and tabs", "a text may end with a comma"},
@@ -67,15 +69,20 @@ TEST(DelimiterGuess, SaysWhatCannotBeFoundOut)
         {automatic("PD"), "A|B;C D\nD|E;F G\n", "it may be the semicolon or the vertical bar or blanks and tabs",
          "three readings"},
         {automatic(), "Number\n1\n", "cannot be found out: with a comma", "one column"},
-        {automatic(), "", "cannot be found out: with a comma", "nothing"},
-        {automatic(), "a,b\n1,2\n", "cannot be found out: with a comma", "no variable"},
+        {automatic(), "", "error 1:1 a header row of variable names was expected", "nothing, with any delimiter"},
+        {automatic(), "Number;North\xFFing\n1;2\n", "error 1:13 the file is not UTF-8", "wrong with any delimiter"},
+        {automatic(), "a,b\n1,2\n", "error 1:1 no column of the header row is a variable", "no variable"},
+        {absent, "Number;Elev\n1;2\n", "error 1:1 there is no column \"Elv\": did you mean \"Elev\"?",
+         "a column that one delimiter alone could give"},
+        {automatic(), "Number,Count;Northing,Easting;Flag\n1,2\n", "cannot be found out: with a comma",
+         "two that find columns"},
         {automatic("PNEZD"), "1,2,3\n", "error 1:5 the row has 3 cells: 5 were expected", "too few cells with any"},
         {automatic(), "Number,Northing\n1,2\n2,x\n", "error 3:3 the cell \"x\" of the column \"Northing\"",
          "the header row tells, and the row is wrong"},
         {automatic(), "Number,Northing\n1,2\n2\n", "error 3:1 the row has 1 cells", "a cell is missing"},
         {misspelt, "Number,Northing\n1,2\n", "the dictionary has no variable \"Elev\": did you mean",
          "no delimiter makes that right"},
-        {automatic("PX"), "1,2\n", "\"PX\" is no order", "nor that"},
+        {automatic("PX"), "1,2\n", "\"PX\" is not an order", "nor that"},
     };
     for (const Row &row : rows) {
         EXPECT_TRUE(survey::rowsOf(row.text, row.dialect).join(u'\n').contains(QString::fromUtf8(row.contains)))

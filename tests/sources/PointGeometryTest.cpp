@@ -82,7 +82,7 @@ TEST(PointGeometry, SaysWhatStandsThereInstead)
         changed[at] = byte;
         return changed;
     };
-    const char *nothing = "bytes that are no geometry";
+    const char *nothing = "bytes that are not a geometry";
     const Row rows[] = {
         {"", nothing, "nothing"},
         {"GP", nothing, "two letters"},

@@ -88,7 +88,7 @@ public:
     void stop() override { isStopped = true; }
 
     std::size_t wrongRow = std::numeric_limits<std::size_t>::max();
-    std::size_t reads = 0;
+    std::atomic<std::size_t> reads = 0;
     int rewinds = 0;
     std::atomic<bool> isWaiting = false;
     std::atomic<bool> isStopped = false;
@@ -189,6 +189,31 @@ TEST(RowObjectList, ARowThatIsLongInComingCanBeStopped)
         EXPECT_EQ(calls, 3) << isSorted << ": it is asked while nothing comes";
         EXPECT_TRUE(all.rows->isStopped) << isSorted;
         EXPECT_FALSE(all.list.error()) << isSorted << ": to be stopped is no mistake of the data";
+    }
+}
+
+TEST(RowObjectList, SortingWhatWasReadCanBeStopped)
+{
+    constexpr std::size_t count = 20'000;
+    const auto sort = [](int most, int &calls) {
+        StreamedRows *rows = nullptr;
+        List all(count, [&](std::size_t) {
+            calls += rows != nullptr && rows->reads >= count ? 1 : 0;
+            return calls <= most;
+        });
+        rows = all.rows;
+        all.list.Sort({keyId});
+        const int asked = calls;
+        EXPECT_EQ(all.list.GetAt(0) == nullptr, most < asked) << most;
+        EXPECT_FALSE(all.list.error()) << most;
+        return asked;
+    };
+    int all = 0;
+    const int asked = sort(1'000'000, all);
+    EXPECT_GE(asked, 12) << "while the sort keys are made, and while they are compared";
+    for (int most = 1; most < asked; ++most) {
+        int calls = 0;
+        EXPECT_EQ(sort(most, calls), most + 1) << "it is not asked again";
     }
 }
 

@@ -97,6 +97,8 @@ TEST(ValueParser, StoresByTheTypeOfTheVariable)
         {VARIABLE_STATION, "1e+3", "8 1000", "the plus of an exponent"},
         {VARIABLE_STATION, "INF", "8 inf", "infinite"},
         {VARIABLE_STATION, "1+2+3", "misfit", "two pluses"},
+        {VARIABLE_STATION, "1+5.0", "misfit", "1+005.0 or 1+05.0 may be meant: 15.0 is neither"},
+        {VARIABLE_STATION, "1+0456", "misfit", "no station has four digits there"},
         {VARIABLE_STATION, "12+", "misfit", "nothing behind the plus"},
         {VARIABLE_STATION, "+", "misfit", "a plus alone"},
         {VARIABLE_STATION, "12+-345", "misfit", "a sign behind the plus"},
