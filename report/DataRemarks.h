@@ -16,19 +16,20 @@ struct ValueCount
     qint64 firstLine = 0; ///< of the report, from 1
 };
 
-/// What a column of a table does not show as it is.
+/// What a column of a table, or a line of a block, does not show as it is.
 struct ColumnRemarks
 {
-    QString variable;   ///< the name of the variable that the column shows
-    quint32 id = 0;     ///< its identifier in the dictionary
-    ValueCount tooWide; ///< values wider than the column, which is then wider, or shows "#"
-    ValueCount missing; ///< values that are not there and show as 0
+    QString variable;     ///< the name of the variable that the column shows
+    ValueCount tooWide;   ///< values wider than the column, which is then wider, or shows "#"
+    ValueCount missing;   ///< values that are not there and show as 0
+    ValueCount blank;     ///< numbers that are not there and show as blanks, as asked for
+    ValueCount notFinite; ///< values that are infinite or not-a-number
 };
 
-/// What the table that was written last does not show as it is, by its fields.
+/// What the table or block that was written last does not show as it is, by its fields.
 struct DataRemarks
 {
-    std::vector<ColumnRemarks> columns; ///< one for each field of the table, in their order
+    std::vector<ColumnRemarks> columns; ///< one for each field, in their order
 
     /// Counts a value. @param row  from 0
     void add(ValueCount &count, quint64 row)
@@ -50,7 +51,7 @@ private:
     void giveLine(qint64 line)
     {
         for (ColumnRemarks &column : columns) {
-            for (ValueCount *count : {&column.tooWide, &column.missing}) {
+            for (ValueCount *count : {&column.tooWide, &column.missing, &column.blank, &column.notFinite}) {
                 count->firstLine = count->count != 0 && count->firstLine == 0 ? line : count->firstLine;
             }
         }

@@ -24,17 +24,24 @@ std::vector<FieldFormatter> formattersOf(const UXmlReportTable &table)
     return fields;
 }
 
-DataRemarks remarksFor(const UXmlReportTable &table)
+/// @param record  a table or a block
+template <typename Record>
+DataRemarks remarksFor(const Record &record)
 {
     DataRemarks remarks;
-    remarks.columns.resize(static_cast<std::size_t>(table.GetFieldsCount()));
-    for (int i = 0; i < table.GetFieldsCount(); ++i) {
-        const sXmlReportField field = table.GetField(i);
-        ColumnRemarks &column = remarks.columns[static_cast<std::size_t>(i)];
-        column.variable = field.VariableName;
-        column.id = static_cast<quint32>(field.ID);
+    remarks.columns.resize(static_cast<std::size_t>(record.GetFieldsCount()));
+    for (int i = 0; i < record.GetFieldsCount(); ++i) {
+        remarks.columns[static_cast<std::size_t>(i)].variable = record.GetField(i).VariableName;
     }
     return remarks;
+}
+
+/// Counts a value by how it shows.
+void addShown(DataRemarks &remarks, ColumnRemarks &column, Shown shown, quint64 row)
+{
+    if (shown != Shown::Whole) {
+        remarks.add(shown == Shown::TooWide ? column.tooWide : column.notFinite, row);
+    }
 }
 
 } // namespace
@@ -45,9 +52,13 @@ QString withChainageLabel(QString heading, const QString &label)
     return heading.replace(word, label);
 }
 
-void DataWriter::writeBlock(const UXmlReportBlock &block, const UDataObject &object, int linesBefore, int linesAfter)
+void DataWriter::writeBlock(const UXmlReportBlock &block, const UDataObject &object, int linesBefore, int linesAfter,
+                            DataRemarks *remarks)
 {
     page_.skipLines(linesBefore);
+    if (remarks != nullptr) {
+        *remarks = remarksFor(block);
+    }
     for (int i = 0; i < block.GetFieldsCount(); ++i) {
         const sXmlReportField field = block.GetField(i);
         const FieldFormatter formatter(field);
@@ -59,10 +70,17 @@ void DataWriter::writeBlock(const UXmlReportBlock &block, const UDataObject &obj
         row_.append(field.Label);
         row_.append(options_.separator);
         const std::size_t start = row_.size();
-        formatter.append(row_, options_, entry->kind(), entry->GetData(), QStringView());
+        const Shown shown = formatter.append(row_, options_, entry->kind(), entry->GetData(), QStringView());
+        // No column follows that a wide value would move: only what shows as "#" is lost.
+        if (remarks != nullptr && (shown != Shown::TooWide || options_.printHash)) {
+            addShown(*remarks, remarks->columns[static_cast<std::size_t>(i)], shown, 0);
+        }
         row_.trim(start);
         if (!page_.losesNothing([this] { page_.writeLine(row_.view(), 0, 1, 0); })) {
             break;
+        }
+        if (remarks != nullptr) {
+            remarks->setLine(page_.lineCount());
         }
     }
     endOutput(linesAfter);
@@ -152,13 +170,13 @@ void DataWriter::formatRow(const std::vector<FieldFormatter> &fields, const UDat
         case FieldMarker::None: {
             const UDictEntry *entry = object.Find(field.id());
             if (entry != nullptr) {
-                if (!field.append(row_, options_, entry->kind(), entry->GetData(), suffix)) {
-                    remarks.add(about.tooWide, row);
-                }
+                addShown(remarks, about, field.append(row_, options_, entry->kind(), entry->GetData(), suffix), row);
             } else {
                 field.append(row_, options_, ValueKind::None, nullptr, suffix);
                 if (field.showsZeroForNone(options_)) {
                     remarks.add(about.missing, row);
+                } else if (field.showsZeroForNone(FormatOptions())) {
+                    remarks.add(about.blank, row);
                 }
             }
             row_.append(options_.separator);

@@ -18,7 +18,9 @@ class DataWriter
 public:
     DataWriter(PageWriter &page, const FormatOptions &options) : page_(page), options_(options) {}
 
-    void writeBlock(const UXmlReportBlock &block, const UDataObject &object, int linesBefore, int linesAfter);
+    /// @param remarks  receives what the block does not show as it is; may be null
+    void writeBlock(const UXmlReportBlock &block, const UDataObject &object, int linesBefore, int linesAfter,
+                    DataRemarks *remarks = nullptr);
 
     struct TableLayout
     {

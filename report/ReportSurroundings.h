@@ -23,7 +23,8 @@ struct ReportSurroundings
     QMargins margins = defaultMargins;   ///< hundredths of a millimetre
     unsigned fontSize = defaultFontSize; ///< points
     bool printHash = false;              ///< whether a value wider than its column prints as "#"
-    DataRemarks *remarks = nullptr;      ///< receives what the table written last does not show as it is; may be null
+    DataRemarks *remarks =
+        nullptr; ///< receives what the table or block written last does not show as it is; may be null
 };
 
 } // namespace kareport

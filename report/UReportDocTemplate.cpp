@@ -83,7 +83,8 @@ bool UReportDoc::WriteDataBlock(const UDataObject *object, int linesBefore, int 
     }
     return writeData(parts_->page, [&] {
         const kareport::FormatOptions options = parts_->data.formatOptions();
-        kareport::DataWriter(parts_->page, options).writeBlock(*block, *object, linesBefore, linesAfter);
+        kareport::DataWriter(parts_->page, options)
+            .writeBlock(*block, *object, linesBefore, linesAfter, parts_->data.remarks);
     });
 }
 

@@ -69,15 +69,16 @@ FieldFormatter::FieldFormatter(const sXmlReportField &field)
       id_(static_cast<quint32>(field.ID))
 {}
 
-bool FieldFormatter::append(TextBuffer &out, const FormatOptions &options, ValueKind kind, const void *value,
-                            QStringView suffix) const
+Shown FieldFormatter::append(TextBuffer &out, const FormatOptions &options, ValueKind kind, const void *value,
+                             QStringView suffix) const
 {
     if (marker_ == FieldMarker::Filler) {
         out.appendFill(columnOf(width_), u' ');
-        return true;
+        return Shown::Whole;
     }
     Input input(kind, value);
-    if (kind == ValueKind::Double && std::isfinite(input.number)) {
+    const bool isFinite = kind != ValueKind::Double || std::isfinite(input.number);
+    if (kind == ValueKind::Double && isFinite) {
         input.number = options.settings->ConvertToDisplay(input.number, type_, 0);
     }
     const std::size_t start = out.size();
@@ -88,7 +89,8 @@ bool FieldFormatter::append(TextBuffer &out, const FormatOptions &options, Value
         out.appendFill(columnOf(width_), u'#');
     }
     fit(out, start, options.separator);
-    return length <= columnOf(width_) || width_ <= 0 || options.separator == u'\t';
+    const bool isWhole = length <= columnOf(width_) || width_ <= 0 || options.separator == u'\t';
+    return !isFinite ? Shown::NotFinite : isWhole ? Shown::Whole : Shown::TooWide;
 }
 
 bool FieldFormatter::showsZeroForNone(const FormatOptions &options) const

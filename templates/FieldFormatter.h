@@ -20,6 +20,14 @@ struct FormatOptions
     bool printHash = false;    ///< a text wider than its column shows as "#"
 };
 
+/// How a value shows in its column.
+enum class Shown
+{
+    Whole,
+    TooWide,  ///< the text is wider than the column, which then is wider, or shows "#"
+    NotFinite ///< the value is infinite or not-a-number, whatever shows for it
+};
+
 /// A field prepared for being formatted row after row.
 class FieldFormatter
 {
@@ -34,9 +42,9 @@ public:
     /// Appends a value's text, fitted to the field's column.
     /// @param kind    what `value` points to; `None` and any other number count as 0, false or an empty text
     /// @param suffix  "+" shows an offset with its sign, anything else with "L" or "R" after it
-    /// @return whether the text fits the column; one without a width, or in the spreadsheet form, has room for any
-    bool append(TextBuffer &out, const FormatOptions &options, ValueKind kind, const void *value,
-                QStringView suffix) const;
+    /// @return how it shows; a column without a width, or in the spreadsheet form, has room for any text
+    Shown append(TextBuffer &out, const FormatOptions &options, ValueKind kind, const void *value,
+                 QStringView suffix) const;
 
 private:
     enum class Align

@@ -36,7 +36,8 @@ bool ReportTextWriter::writePieces(Text text, bool last)
     if (!hasBegun_) {
         hasBegun_ = true;
         // What cannot be converted to bytes counts as not written.
-        hasFailed_ = !doneWhileMemoryLasts([this] { bytes_.resize(ReportTextEncoder::bound(pieceSize)); });
+        lacksMemory_ = !doneWhileMemoryLasts([this] { bytes_.resize(ReportTextEncoder::bound(pieceSize)); });
+        hasFailed_ = lacksMemory_;
         if (lineEnds_ == LineEnds::ReportFile) {
             writeBytes(reportFileMark, sizeof reportFileMark);
         }

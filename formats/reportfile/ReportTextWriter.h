@@ -38,6 +38,8 @@ public:
 
     /// Whether a write has failed.
     bool hasFailed() const { return hasFailed_; }
+    /// Whether it has failed as there was no memory for its bytes: the device is not the cause.
+    bool lacksMemory() const { return lacksMemory_; }
     /// Whether there was no text yet.
     bool isEmpty() const { return isEmpty_; }
 
@@ -53,6 +55,7 @@ private:
     bool hasBegun_ = false;
     bool isEmpty_ = true;
     bool hasFailed_ = false;
+    bool lacksMemory_ = false;
 };
 
 } // namespace kareport
