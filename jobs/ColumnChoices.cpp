@@ -36,17 +36,29 @@ std::vector<ColumnChoice> readColumnChoices(const JsonNode &node)
     return choices;
 }
 
-std::optional<InputError> whyNotOpened(const RowObjectList &rows, const DataRequest &request)
+QString readWholeText(const JsonNode &node)
 {
-    auto error = rows.error();
-    const auto &fault = rows.reader().wrongChoice();
-    if (!error || !fault || fault->choice.isEmpty()) {
-        return error;
+    const QString text = node.text();
+    if (text.contains(QChar())) {
+        node.fail(Xlate("a text without a zero character was expected"));
+    }
+    return text;
+}
+
+Expected<std::unique_ptr<RowList>> openedRows(std::unique_ptr<RowObjectList> rows, const DataRequest &request)
+{
+    const auto error = rows->error();
+    if (!error) {
+        return {std::move(rows)};
+    }
+    const auto &fault = rows->reader().wrongChoice();
+    if (!fault || fault->choice.isEmpty()) {
+        return *error;
     }
     JsonPath place = request.path;
     place.emplace_back(QStringLiteral("columns"));
     place.emplace_back(fault->choice);
-    // The name of the data is nowhere in the job's place.
+    // The place in the job does not name the data.
     return request.source.errorAt(place, QStringLiteral("%1: %2").arg(error->file, fault->text));
 }
 

@@ -4,6 +4,7 @@
 #include "JsonNode.h"
 #include "RowObjectList.h"
 
+#include <memory>
 #include <vector>
 
 namespace kareport
@@ -15,8 +16,11 @@ struct DataRequest;
 /// with one fails its node.
 std::vector<ColumnChoice> readColumnChoices(const JsonNode &node);
 
-/// What is wrong with the columns or the first rows of a list that has been made. What a job chose wrongly has the place
-/// of the choice in the job; nothing when the rows can be read.
-std::optional<InputError> whyNotOpened(const RowObjectList &rows, const DataRequest &request);
+/// Reads a text that a database is given. A zero character, which would end it there, fails the node.
+QString readWholeText(const JsonNode &node);
+
+/// Rows that have been made, or what is wrong with their columns or with the first of them. What a job chose wrongly has the
+/// place of the choice in the job.
+Expected<std::unique_ptr<RowList>> openedRows(std::unique_ptr<RowObjectList> rows, const DataRequest &request);
 
 } // namespace kareport

@@ -13,16 +13,36 @@ namespace kareport
 namespace
 {
 
-/// Names of columns that nobody reads, which somebody may have meant for a variable.
+/// More columns than this are not worth a note each: the file is then read with the wrong delimiter, or is no table.
+constexpr std::size_t mostColumnNotes = 100;
+/// How many names a misspelt one is compared with.
+constexpr qsizetype mostNames = 1000;
+
+bool isUnread(const SourceColumn &column)
+{
+    return !column.isKnown && !column.isOffered && !column.name.isEmpty();
+}
+
+/// Names of columns that are not read and may have been meant for a variable.
 QStringList unreadNames(const SourceColumns &columns)
 {
     QStringList names;
     for (const SourceColumn &column : columns.columns) {
-        if (!column.isKnown && !column.isOffered && !column.name.isEmpty()) {
+        if (isUnread(column) && names.size() < mostNames) {
             names.append(column.name);
         }
     }
     return names;
+}
+
+/// The variable that is read under the identifier of another one.
+QString shownInstead(const SourceColumns &columns, const sXmlReportDictionary &dictionary, qint32 id)
+{
+    const auto found =
+        std::find_if(dictionary.Variables.begin(), dictionary.Variables.end(), [&](const sXmlReportVariable &other) {
+            return other.ID == id && isRead(columns, other.VariableName);
+        });
+    return found != dictionary.Variables.end() ? found->VariableName : QString();
 }
 
 } // namespace
@@ -45,12 +65,22 @@ QStringList variableNames(const sXmlReportDictionary &dictionary)
     return names;
 }
 
+bool isRead(const SourceColumns &columns, const QString &variable)
+{
+    return columns.variables.contains(foldedKey(variable));
+}
+
 std::vector<JobNote> unknownColumns(const SourceColumns &columns, const sXmlReportDictionary &dictionary)
 {
     std::vector<JobNote> notes;
     const QStringList names = variableNames(dictionary);
+    std::size_t more = 0;
     for (const SourceColumn &column : columns.columns) {
-        if (column.isKnown || column.isOffered || column.name.isEmpty()) {
+        if (!isUnread(column)) {
+            continue;
+        }
+        if (notes.size() == mostColumnNotes) {
+            ++more;
             continue;
         }
         const QString sentence = Xlate("the column \"%1\" is no variable of the dictionary \"%2\"")
@@ -59,6 +89,11 @@ std::vector<JobNote> unknownColumns(const SourceColumns &columns, const sXmlRepo
         const QString text = question.isEmpty() ? sentence : sentence + QStringLiteral(": ") + question;
         notes.push_back({JobNote::Kind::UnknownColumn, InputError{columns.source, column.place, text}});
     }
+    if (more > 0) {
+        const QString text = Xlate("%1 more columns are not variables of the dictionary \"%2\"")
+                                 .arg(QString::number(more), dictionary.DictionaryName);
+        notes.push_back({JobNote::Kind::UnknownColumn, InputError{columns.source, std::nullopt, text}});
+    }
     return notes;
 }
 
@@ -66,10 +101,8 @@ QStringList assumedUnits(const SourceColumns &columns, const sXmlReportDictionar
 {
     QStringList keys;
     for (const sXmlReportVariable &variable : dictionary.Variables) {
-        const auto id = static_cast<unsigned>(variable.ID);
         const QString key = units.assumedKey(variable.Type);
-        const bool isRead = std::find(columns.ids.begin(), columns.ids.end(), id) != columns.ids.end();
-        if (isRead && !key.isEmpty() && !keys.contains(key)) {
+        if (!key.isEmpty() && !keys.contains(key) && isRead(columns, variable.VariableName)) {
             keys.append(key);
         }
     }
@@ -95,12 +128,14 @@ std::vector<UnfilledField> unfilledFields(const SourceColumns &columns, const sX
         }
         seen.append(foldedKey(field.VariableName));
         if (variable == dictionary.Variables.rend()) {
-            unfilled.push_back({field.VariableName, didYouMean(field.VariableName, variableNames(dictionary)), false});
+            unfilled.push_back(
+                {field.VariableName, didYouMean(field.VariableName, variableNames(dictionary)), false, {}});
             continue;
         }
-        const auto id = static_cast<unsigned>(variable->ID);
-        if (std::find(columns.ids.begin(), columns.ids.end(), id) == columns.ids.end()) {
-            unfilled.push_back({field.VariableName, didYouMean(field.VariableName, unread), true});
+        // Not the identifier counts: another variable may have the same one.
+        if (!isRead(columns, field.VariableName)) {
+            unfilled.push_back({field.VariableName, didYouMean(field.VariableName, unread), true,
+                                shownInstead(columns, dictionary, variable->ID)});
         }
     }
     return unfilled;

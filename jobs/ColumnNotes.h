@@ -32,12 +32,17 @@ struct UnfilledField
     QString variable;
     QString question; ///< which column or variable may have been meant, as a question; empty for none
     bool isVariable;  ///< of the dictionary
+    QString shown;    ///< the variable that a column fills and that has the same identifier, so that its value is shown
+                      ///< instead; empty for none
 };
 
 /// The names of the variables of a dictionary, in its order.
 QStringList variableNames(const sXmlReportDictionary &dictionary);
 
-/// Notes on the columns that are no variable of a dictionary.
+/// Whether a variable is read from a column.
+bool isRead(const SourceColumns &columns, const QString &variable);
+
+/// Notes on the columns that are no variable of a dictionary. Of very many, the last note says how many more there are.
 std::vector<JobNote> unknownColumns(const SourceColumns &columns, const sXmlReportDictionary &dictionary);
 
 /// The keys of the units that numbers of the data are taken to be in, as nobody has said them.

@@ -1,12 +1,10 @@
-#include "CsvData.h"
-
 #include "ColumnChoices.h"
 #include "CsvObjectList.h"
 #include "CsvOptions.h"
+#include "DataKinds.h"
+#include "FileData.h"
 #include "JobFileName.h"
 #include "Xlate.h"
-
-#include <QFileInfo>
 
 namespace kareport
 {
@@ -14,41 +12,28 @@ namespace kareport
 namespace
 {
 
-class CsvData : public DataSource
+class CsvData : public FileData
 {
 public:
-    CsvData(QString file, CsvDialect dialect) : file_(std::move(file)), dialect_(std::move(dialect)) {}
-
-    Expected<std::unique_ptr<RowList>> open(const DataRequest &request) const override
-    {
-        const auto bytes = request.files.open(file_);
-        if (const InputError *error = errorOf(bytes)) {
-            return request.errorAt(QStringLiteral("csv"), unreadableData(file_, error->text));
-        }
-        const auto &opened = std::get<std::shared_ptr<const FileBytes>>(bytes);
-        auto rows =
-            std::make_unique<CsvObjectList>(opened, dialect_, request.variables(),
-                                            request.beginReading(QFileInfo(file_).fileName(), opened->view().size()));
-        if (auto error = whyNotOpened(*rows, request)) {
-            return *std::move(error);
-        }
-        return {std::move(rows)};
-    }
-
-    QStringList files() const override { return readsStandardInput() ? QStringList() : QStringList(file_); }
-    bool isAllInFiles() const override { return !readsStandardInput(); }
-    bool readsStandardInput() const override { return file_ == u"-"; }
+    CsvData(const QString &file, CsvDialect dialect)
+        : FileData(QStringLiteral("csv"), file), dialect_(std::move(dialect))
+    {}
 
     std::optional<InputError> noRow() const override
     {
         const QString sentence = dialect_.hasHeader
                                      ? Xlate("a row was expected after the header row: a block shows the first one")
                                      : Xlate("a row was expected: a block shows the first one");
-        return InputError{file_, TextPlace(), sentence};
+        return InputError{file(), TextPlace(), sentence};
     }
 
 private:
-    QString file_;
+    Expected<std::unique_ptr<RowList>> rowsOf(const std::shared_ptr<const FileBytes> &bytes, const DataRequest &request,
+                                              const ReadProgress &progress) const override
+    {
+        return openedRows(std::make_unique<CsvObjectList>(bytes, dialect_, request.variables(), progress), request);
+    }
+
     CsvDialect dialect_;
 };
 

@@ -11,15 +11,56 @@ namespace
 
 constexpr int mostSkipped = 1'000'000; ///< lines before the header row
 
-/// One ASCII character that is none of quotes and line ends, which a row has anyway. @return 0 after failing the node
+/// One ASCII character that no cell needs: no quote, line end, letter, digit or sign. @return 0 after failing the node
 char readMark(const JsonNode &node, const QString &expected)
 {
     const QString text = node.text();
-    if (text.size() != 1 || text[0].unicode() > 127 || text[0].isNull() || QStringLiteral("\"\r\n").contains(text[0])) {
+    const bool isOne = text.size() == 1 && text[0].unicode() > 0 && text[0].unicode() < 128;
+    if (!isOne || text[0].isLetterOrNumber() || QStringLiteral("\"\r\n+-").contains(text[0])) {
         node.fail(expected);
         return '\0';
     }
     return text[0].toLatin1();
+}
+
+/// Fails a key whose character has another meaning already.
+void failWhereTaken(const JsonNode &node, const QString &other)
+{
+    node.fail(Xlate("the character is that of \"%1\": another one was expected").arg(other));
+}
+
+/// Fails where a character of numbers is the delimiter and the job does not say both: then one of them was forgotten. Numbers in
+/// quotes may have it, as spreadsheets write them.
+void checkDelimiter(const JsonNode &set, const CsvDialect &dialect)
+{
+    const JsonNode delimiter = set[QStringLiteral("delimiter")];
+    const JsonNode decimal = set[QStringLiteral("decimal")];
+    if (dialect.kind != DelimiterKind::Character || (delimiter.exists() && decimal.exists())) {
+        return;
+    }
+    if (dialect.delimiter == dialect.numbers.decimal) {
+        const bool isSaid = decimal.exists();
+        failWhereTaken(isSaid ? decimal : delimiter, isSaid ? QStringLiteral("delimiter") : QStringLiteral("decimal"));
+    }
+    if (!delimiter.exists() && dialect.numbers.thousands == std::string_view(&dialect.delimiter, 1)) {
+        failWhereTaken(set[QStringLiteral("thousands")], QStringLiteral("delimiter"));
+    }
+}
+
+/// Fails where a row of data may begin with the character of comments.
+void checkComment(const JsonNode &comment, const CsvDialect &dialect)
+{
+    if (!dialect.comment) {
+        return;
+    }
+    const char mark = *dialect.comment;
+    const bool isDelimiter =
+        dialect.kind == DelimiterKind::Character ? mark == dialect.delimiter : mark == ' ' || mark == '\t';
+    if (isDelimiter) {
+        failWhereTaken(comment, QStringLiteral("delimiter"));
+    } else if (mark == dialect.numbers.decimal) {
+        failWhereTaken(comment, QStringLiteral("decimal"));
+    }
 }
 
 /// Names of columns in their order, or an object that maps variables to columns.
@@ -77,7 +118,8 @@ void readDelimiter(const JsonNode &node, CsvDialect &dialect)
     } else {
         dialect.delimiter = readMark(
             node,
-            Xlate("a text of one ASCII character that is neither a quote nor a line end, or one of %1, was expected")
+            Xlate("one ASCII character that is not a letter, a digit, a sign, a quote or a line end, or one of %1, was "
+                  "expected")
                 .arg(QStringLiteral("whitespace, auto")));
     }
 }
@@ -108,9 +150,12 @@ CsvDialect readCsvDialect(const JsonNode &set)
     dialect.skip = set[QStringLiteral("skip")].whole(0, 0, mostSkipped);
     if (const JsonNode comment = set[QStringLiteral("comment")]; comment.exists()) {
         dialect.comment = readMark(
-            comment, Xlate("a text of one ASCII character that is neither a quote nor a line end was expected"));
+            comment,
+            Xlate("one ASCII character that is not a letter, a digit, a sign, a quote or a line end was expected"));
     }
     dialect.passesBlankLines = set[QStringLiteral("skipBlankLines")].boolean(false);
+    checkDelimiter(set, dialect);
+    checkComment(set[QStringLiteral("comment")], dialect);
     return dialect;
 }
 

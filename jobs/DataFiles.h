@@ -10,16 +10,26 @@
 namespace kareport
 {
 
-/// The files that the data of a job is read from, each opened once: a pipe can be read once only, and its bytes serve
-/// every step.
+class PostgresConnection;
+class SqliteFile;
+
+/// The files and databases that the data of a job is read from, each opened once: a pipe can be read once only, and every step
+/// sees the same state of the data.
 class DataFiles
 {
 public:
     /// @param path  "-" for standard input
     Expected<std::shared_ptr<const FileBytes>> open(const QString &path);
 
+    /// The SQLite database of a path; empty as long as nobody has opened it.
+    std::shared_ptr<SqliteFile> &database(const QString &path) { return databases_[path]; }
+    /// The connection to a PostgreSQL database; empty as long as nobody has made it.
+    std::shared_ptr<PostgresConnection> &connection(const QString &name) { return connections_[name]; }
+
 private:
     QHash<QString, std::shared_ptr<const FileBytes>> files_; ///< by their paths
+    QHash<QString, std::shared_ptr<SqliteFile>> databases_;  ///< by their paths
+    QHash<QString, std::shared_ptr<PostgresConnection>> connections_;
 };
 
 /// Says that a file with data cannot be read.

@@ -1,18 +1,11 @@
 #include "DataKinds.h"
 
-#include "CsvData.h"
-#include "JsonData.h"
-#include "LandXmlData.h"
-#include "PostgresData.h"
-#include "SqliteData.h"
-#include "ValuesData.h"
-
 namespace kareport
 {
 
 const std::vector<DataKind> &dataKinds()
 {
-    // A kind is added by a line here and a pair of files that makes it, as CsvData.h and CsvData.cpp.
+    // A kind is added by a line here, one in the header, and a file that makes it, as CsvData.cpp.
     static const std::vector<DataKind> kinds = [] {
         std::vector<DataKind> made;
         made.push_back(csvDataKind());

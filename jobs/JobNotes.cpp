@@ -19,6 +19,9 @@ QString keyOf(JobNote::Kind kind)
     case JobNote::Kind::UnknownColumn: return QStringLiteral("unknown-column");
     case JobNote::Kind::WideValue: return QStringLiteral("wide-value");
     case JobNote::Kind::MissingValue: return QStringLiteral("missing-value");
+    case JobNote::Kind::BlankValue: return QStringLiteral("blank-value");
+    case JobNote::Kind::NotFinite: return QStringLiteral("not-finite");
+    case JobNote::Kind::UnknownSortKey: return QStringLiteral("unknown-sort-key");
     case JobNote::Kind::Difference: return QStringLiteral("difference");
     case JobNote::Kind::PassedOver: return QStringLiteral("passed-over");
     case JobNote::Kind::AssumedUnit: return QStringLiteral("assumed-unit");

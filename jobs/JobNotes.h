@@ -22,8 +22,11 @@ struct JobNote
         UnfilledField, ///< a field whose variable is in no column or no dictionary, so that it shows nothing or zero
         WideValue,     ///< values wider than their column
         MissingValue,  ///< values that are not there and show as 0
-        Difference,    ///< what does not fit together in the data itself
-        PassedOver,    ///< what a data file holds and no list reads: said, but no mistake of anybody
+        BlankValue, ///< numbers that are not there and show as blanks, as the job asks for: for the file of notes alone
+        NotFinite,  ///< values that are infinite or not-a-number
+        UnknownSortKey, ///< a sort key of a table that is in no dictionary, so that the rows are sorted by another one
+        Difference,     ///< what does not fit together in the data itself
+        PassedOver,     ///< what a data file holds and no list reads: said, but no mistake of anybody
         AssumedUnit ///< a unit of the data that nobody has said: for the file of notes alone, no reason to say anything
     };
     Kind kind;
@@ -33,7 +36,7 @@ struct JobNote
     quint64 firstRow = 0; ///< of the data as it is printed, from 1; 0 for none
 
     /// Whether somebody has to look at it.
-    bool isToBeSaid() const { return kind != Kind::AssumedUnit; }
+    bool isToBeSaid() const { return kind != Kind::AssumedUnit && kind != Kind::BlankValue; }
     /// Whether it is an error in a strict job.
     bool isMistake() const { return isToBeSaid() && kind != Kind::PassedOver; }
     /// "file:line:column: note: text", without the parts that are not known.

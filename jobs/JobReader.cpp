@@ -131,7 +131,7 @@ std::optional<Output> readOutput(const JsonNode &node, const QDir &folder, std::
         return std::nullopt;
     }
     if (!kind) {
-        file.fail(Xlate("the ending of \"%1\" says no kind: the key \"as\" with one of %2 was expected")
+        file.fail(Xlate("the ending of \"%1\" does not say the kind: the key \"as\" with one of %2 was expected")
                       .arg(name, outputKindNames()));
         return std::nullopt;
     }

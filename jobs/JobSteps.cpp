@@ -81,23 +81,30 @@ JobSteps::Wrong JobSteps::write(const Job::Block &step, const JsonPath &path)
         return *error;
     }
     RowList &rows = *std::get<std::unique_ptr<RowList>>(opened);
-    // All rows must be valid, though only the first one is shown.
-    for (std::size_t row = 0; rows.GetAt(row) != nullptr; ++row) {
+    // All rows must be valid, though only the first one is shown. It is kept: a query is not run again for it.
+    UDataObject first;
+    bool hasRow = false;
+    for (std::size_t row = 0; const UDataObject *object = rows.GetAt(row); ++row) {
+        if (!hasRow) {
+            first = *object;
+            hasRow = true;
+        }
     }
     if (auto error = rows.error()) {
         return error;
     }
-    if (auto wrong = noteColumns(rows, step.data, *block, Xlate("block"), path)) {
+    const WrittenRecord record = {Xlate("block"), TemplatePart::Block, step.name, block->Use, block->Fields, path};
+    if (auto wrong = noteColumns(rows, step.data, record)) {
         return wrong;
     }
     if (auto wrong = noteSource(rows)) {
         return wrong;
     }
-    if (const UDataObject *object = rows.GetAt(0)) {
-        needMemory(report_.WriteDataBlock(step.name, object, step.before, step.after));
-        return std::nullopt;
+    if (!hasRow) {
+        return isStopped_() ? std::nullopt : std::optional(data_.noRow(step.data, path));
     }
-    return isStopped_() ? std::nullopt : std::optional(data_.noRow(step.data, path));
+    needMemory(report_.WriteDataBlock(step.name, &first, step.before, step.after));
+    return noteValues(rows, record);
 }
 
 JobSteps::Wrong JobSteps::write(const Job::Table &step, const JsonPath &path)
@@ -116,22 +123,26 @@ JobSteps::Wrong JobSteps::write(const Job::Table &step, const JsonPath &path)
         return *error;
     }
     RowList &rows = *std::get<std::unique_ptr<RowList>>(opened);
+    const WrittenRecord record = {Xlate("table"), TemplatePart::Table, step.name, table->Use, table->Fields, path};
     // Columns that are known already are looked at before hundreds of thousands of rows are.
-    if (auto wrong = noteColumns(rows, step.data, *table, Xlate("table"), path)) {
+    if (auto wrong = noteColumns(rows, step.data, record)) {
+        return wrong;
+    }
+    if (auto wrong = noteSortKeys(record)) {
         return wrong;
     }
     needMemory(report_.WriteDataTable(step.name, &rows, step.before, step.after, step.headingAfter));
     if (const auto error = rows.error()) {
         return error;
     }
-    if (auto wrong = noteColumns(rows, step.data, *table, Xlate("table"), path)) {
+    if (auto wrong = noteColumns(rows, step.data, record)) {
         return wrong;
     }
     if (isStopped_()) {
         return std::nullopt;
     }
     auto wrong = noteSource(rows);
-    auto other = noteValues(rows, step.name, path);
+    auto other = noteValues(rows, record);
     return wrong ? wrong : other;
 }
 
@@ -161,91 +172,6 @@ JobSteps::Wrong JobSteps::wrongRecord(const Record &record, const QString &what,
         }
     }
     return std::nullopt;
-}
-
-/// Notes what of the data and of a table or block does not come together, once the columns are known.
-template <typename Record>
-JobSteps::Wrong JobSteps::noteColumns(const RowList &rows, const QString &data, const Record &record,
-                                      const QString &what, const JsonPath &path)
-{
-    const auto columns = rows.columns();
-    if (!columns) {
-        return std::nullopt;
-    }
-    const UXmlReportTpl &tpl = *report_.GetTemplate();
-    const sXmlReportDictionary &dictionary = *tpl.GetDictionary(record.Use);
-    auto wrong = notes_.add(unknownColumns(*columns, dictionary));
-    const auto unfilled = unfilledFields(*columns, record.Fields, dictionary);
-    for (const UnfilledField &field : unfilled) {
-        const QString sentence =
-            field.isVariable
-                ? Xlate("no column fills the field \"%1\" of the %2 \"%3\"").arg(field.variable, what, record.Name)
-                : Xlate("the field \"%1\" of the %2 \"%3\" is not a variable of the dictionary \"%4\"")
-                      .arg(field.variable, what, record.Name, record.Use);
-        const auto note = source_.errorAt(
-            path, field.question.isEmpty() ? sentence : sentence + QStringLiteral(": ") + field.question);
-        auto other = notes_.add({{JobNote::Kind::UnfilledField, note}});
-        wrong = wrong ? wrong : other;
-    }
-    const Job::DataSet &set = *job_.data.constFind(data);
-    if (!set.source->hasOwnUnits()) {
-        for (const QString &key : assumedUnits(*columns, dictionary, set.units)) {
-            const QString text =
-                Xlate("the data \"%1\" does not say the unit of its numbers: %2 was taken").arg(data, key);
-            notes_.add({{JobNote::Kind::AssumedUnit, source_.errorAt({QStringLiteral("data"), data}, text)}});
-        }
-    }
-    return wrong;
-}
-
-/// Notes which values of a table that was written do not show as they are.
-JobSteps::Wrong JobSteps::noteValues(const RowList &rows, const QString &table, const JsonPath &path)
-{
-    Wrong wrong;
-    const auto columns = rows.columns();
-    const auto note = [&](JobNote::Kind kind, const QString &text, const ValueCount &values) {
-        auto one = notes_.add({{kind, source_.errorAt(path, text), values.firstLine, values.count, values.firstRow}});
-        wrong = wrong ? wrong : one;
-    };
-    for (const ColumnRemarks &column : notes_.remarks.columns) {
-        if (column.tooWide.count > 0) {
-            const QString sentence =
-                job_.options.printHash ? Xlate("%1 values are wider than the field \"%2\" of the table \"%3\" and show "
-                                               "as #, the first one in row %4, line %5 of the report")
-                                       : Xlate("%1 values are wider than the field \"%2\" of the table \"%3\", the "
-                                               "first one in row %4, line %5 of the report");
-            note(JobNote::Kind::WideValue,
-                 sentence.arg(QString::number(column.tooWide.count), column.variable, table,
-                              QString::number(column.tooWide.firstRow), QString::number(column.tooWide.firstLine)),
-                 column.tooWide);
-        }
-        // Of a field that no column fills there is a note already.
-        const bool isFilled =
-            !columns || std::find(columns->ids.begin(), columns->ids.end(), column.id) != columns->ids.end();
-        if (column.missing.count > 0 && isFilled) {
-            note(
-                JobNote::Kind::MissingValue,
-                Xlate(
-                    "%1 values of the field \"%2\" of the table \"%3\" are missing and show as 0, the first one in row "
-                    "%4, line %5 of the report")
-                    .arg(QString::number(column.missing.count), column.variable, table,
-                         QString::number(column.missing.firstRow), QString::number(column.missing.firstLine)),
-                column.missing);
-        }
-    }
-    return wrong;
-}
-
-/// Notes what a source says of itself.
-JobSteps::Wrong JobSteps::noteSource(const RowList &rows)
-{
-    Wrong wrong;
-    for (const InputError &note : rows.notes()) {
-        using Kind = JobNote::Kind;
-        auto one = notes_.add({{note.place ? Kind::Difference : Kind::PassedOver, note}});
-        wrong = wrong ? wrong : one;
-    }
-    return wrong;
 }
 
 /// The rows of a data set, typed by a dictionary of the template.

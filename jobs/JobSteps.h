@@ -5,6 +5,7 @@
 #include "Job.h"
 #include "JobData.h"
 #include "JsonSource.h"
+#include "TemplatePlaces.h"
 #include "UReportDoc.h"
 
 #include <functional>
@@ -12,6 +13,17 @@
 
 namespace kareport
 {
+
+/// A table or block of the template that a step writes.
+struct WrittenRecord
+{
+    QString what; ///< "table" or "block", translated
+    TemplatePart part;
+    QString name;
+    QString use; ///< the name of its dictionary
+    const sXmlReportFields &fields;
+    const JsonPath &path; ///< of the step
+};
 
 /// Writes the steps of a job into a report that has the job's template, one after the other.
 class JobSteps
@@ -44,11 +56,14 @@ private:
     template <typename Record>
     Wrong wrongRecord(const Record &record, const QString &what, const QString &name, const JsonPath &path) const;
     Expected<std::unique_ptr<RowList>> openRows(const QString &data, const QString &dictionary, bool firstOnly);
-    template <typename Record>
-    Wrong noteColumns(const RowList &rows, const QString &data, const Record &record, const QString &what,
-                      const JsonPath &path);
+    Wrong noteColumns(const RowList &rows, const QString &data, const WrittenRecord &record);
+    Wrong noteField(const UnfilledField &field, const WrittenRecord &record);
+    Wrong noteSortKeys(const WrittenRecord &record);
     Wrong noteSource(const RowList &rows);
-    Wrong noteValues(const RowList &rows, const QString &table, const JsonPath &path);
+    Wrong noteValues(const RowList &rows, const WrittenRecord &record);
+    Wrong noteValue(const ColumnRemarks &column, const RowList &rows, const WrittenRecord &record);
+    InputError inTemplate(TemplatePart part, const QString &variable, const WrittenRecord &record,
+                          const QString &text) const;
 
     const Job &job_;
     const JsonSource &source_;

@@ -1,11 +1,8 @@
-#include "JsonData.h"
-
 #include "ColumnChoices.h"
+#include "DataKinds.h"
+#include "FileData.h"
 #include "JobFileName.h"
 #include "JsonFileList.h"
-#include "Xlate.h"
-
-#include <QFileInfo>
 
 namespace kareport
 {
@@ -13,33 +10,20 @@ namespace kareport
 namespace
 {
 
-class JsonData : public DataSource
+class JsonData : public FileData
 {
 public:
-    JsonData(QString file, std::vector<ColumnChoice> columns) : file_(std::move(file)), columns_(std::move(columns)) {}
-
-    Expected<std::unique_ptr<RowList>> open(const DataRequest &request) const override
-    {
-        const auto bytes = request.files.open(file_);
-        if (const InputError *error = errorOf(bytes)) {
-            return request.errorAt(QStringLiteral("json"), unreadableData(file_, error->text));
-        }
-        const auto &opened = std::get<std::shared_ptr<const FileBytes>>(bytes);
-        auto rows =
-            std::make_unique<JsonFileList>(opened, columns_, request.variables(),
-                                           request.beginReading(QFileInfo(file_).fileName(), opened->view().size()));
-        if (auto error = whyNotOpened(*rows, request)) {
-            return *std::move(error);
-        }
-        return {std::move(rows)};
-    }
-
-    QStringList files() const override { return readsStandardInput() ? QStringList() : QStringList(file_); }
-    bool isAllInFiles() const override { return !readsStandardInput(); }
-    bool readsStandardInput() const override { return file_ == u"-"; }
+    JsonData(const QString &file, std::vector<ColumnChoice> columns)
+        : FileData(QStringLiteral("json"), file), columns_(std::move(columns))
+    {}
 
 private:
-    QString file_;
+    Expected<std::unique_ptr<RowList>> rowsOf(const std::shared_ptr<const FileBytes> &bytes, const DataRequest &request,
+                                              const ReadProgress &progress) const override
+    {
+        return openedRows(std::make_unique<JsonFileList>(bytes, columns_, request.variables(), progress), request);
+    }
+
     std::vector<ColumnChoice> columns_;
 };
 

@@ -3,11 +3,26 @@
 #include "TextFolding.h"
 #include "Xlate.h"
 
+#include <QVariant>
+
 #include <algorithm>
 #include <utility>
 
 namespace kareport
 {
+
+namespace
+{
+
+/// Stores a number of JSON. A whole one keeps all its digits, which a text shows.
+bool storeNumber(const ValueParser &parser, const QJsonValue &value, UDataObject &object)
+{
+    const QVariant number = value.toVariant();
+    return number.typeId() == QMetaType::LongLong ? parser.storeInteger(number.toLongLong(), object)
+                                                  : parser.storeNumber(number.toDouble(), object);
+}
+
+} // namespace
 
 void storeJsonObject(const JsonNode &node, const FindVariable &findVariable, UDataObject &object,
                      const SeeMember &seeMember)
@@ -26,7 +41,7 @@ void storeJsonObject(const JsonNode &node, const FindVariable &findVariable, UDa
         }
         const JsonNode member = node[name];
         if (names.contains(foldedKey(name))) {
-            member.fail(Xlate("the variable \"%1\" stands twice: each variable was expected once").arg(name));
+            member.fail(Xlate("the variable \"%1\" occurs twice: each variable was expected once").arg(name));
             return;
         }
         names.insert(foldedKey(name));
@@ -35,7 +50,7 @@ void storeJsonObject(const JsonNode &node, const FindVariable &findVariable, UDa
         switch (value.type()) {
         case QJsonValue::Null: fits = true; break;
         case QJsonValue::Bool: fits = parser->storeBoolean(value.toBool(), object); break;
-        case QJsonValue::Double: fits = parser->storeNumber(value.toDouble(), object); break;
+        case QJsonValue::Double: fits = storeNumber(*parser, value, object); break;
         case QJsonValue::String: fits = parser->store(value.toString().toStdString(), object); break;
         default: break;
         }
@@ -82,7 +97,7 @@ void JsonObjectList::noteMember(const JsonSource &source, const JsonNode &member
     }
     names_.insert(name);
     if (parser != nullptr) {
-        columns_.ids.push_back(parser->id());
+        columns_.variables.append(foldedKey(name));
     }
     // Finding a place reads the job from its beginning: it is done for as many as somebody may read.
     constexpr qsizetype mostPlaces = 100;

@@ -53,7 +53,7 @@ std::variant<QJsonValue, QString> parsedOrText(const QString &text)
         return QJsonValue(text);
     }
     if (const auto repeated = findRepeatedKey(json)) {
-        return Xlate("the key \"%1\" stands twice in \"%2\"").arg(quoteOf(repeated->key), quoteOf(text));
+        return Xlate("the key \"%1\" occurs twice in \"%2\"").arg(quoteOf(repeated->key), quoteOf(text));
     }
     return document.array().first();
 }
@@ -122,7 +122,7 @@ Expected<JsonSource> JsonSource::fromBytes(const QString &path, const QByteArray
     }
     if (const auto repeated = findRepeatedKey(bytes)) {
         return InputError{path, repeated->place,
-                          Xlate("the key \"%1\" stands in line %2 already: each key was expected once")
+                          Xlate("the key \"%1\" is in line %2 already: each key was expected once")
                               .arg(quoteOf(repeated->key), QString::number(repeated->firstLine))};
     }
     JsonSource source;

@@ -1,12 +1,10 @@
-#include "LandXmlData.h"
-
+#include "DataKinds.h"
+#include "FileData.h"
 #include "JobFileName.h"
 #include "LandXmlList.h"
 #include "LandXmlQueryReader.h"
 #include "VariableType.h"
 #include "Xlate.h"
-
-#include <QFileInfo>
 
 namespace kareport
 {
@@ -14,39 +12,30 @@ namespace kareport
 namespace
 {
 
-class LandXmlData : public DataSource
+class LandXmlData : public FileData
 {
 public:
     /// @param isInFileUnits  lengths of the query are in the unit of the file, not in that of the data set
-    LandXmlData(QString file, LandXmlQuery query, bool isInFileUnits)
-        : file_(std::move(file)), query_(std::move(query)), isInFileUnits_(isInFileUnits)
+    LandXmlData(const QString &file, LandXmlQuery query, bool isInFileUnits)
+        : FileData(QStringLiteral("landxml"), file), query_(std::move(query)), isInFileUnits_(isInFileUnits)
     {}
 
-    Expected<std::unique_ptr<RowList>> open(const DataRequest &request) const override
+    bool hasOwnUnits() const override { return true; }
+
+private:
+    Expected<std::unique_ptr<RowList>> rowsOf(const std::shared_ptr<const FileBytes> &bytes, const DataRequest &request,
+                                              const ReadProgress &progress) const override
     {
-        const auto bytes = request.files.open(file_);
-        if (const InputError *error = errorOf(bytes)) {
-            return request.errorAt(QStringLiteral("landxml"), unreadableData(file_, error->text));
-        }
-        const auto &opened = std::get<std::shared_ptr<const FileBytes>>(bytes);
         LandXmlQuery query = query_;
         query.unit = isInFileUnits_ ? std::nullopt : std::optional(request.units.factorOf(VARIABLE_LENGTH));
-        auto rows =
-            std::make_unique<LandXmlList>(opened, std::move(query), request.variablesIn(LandXmlList::units()).find,
-                                          request.beginReading(QFileInfo(file_).fileName(), opened->view().size()));
+        auto rows = std::make_unique<LandXmlList>(bytes, std::move(query),
+                                                  request.variablesIn(LandXmlList::units()).find, progress);
         if (auto error = rows->error()) {
             return *std::move(error);
         }
-        return rows;
+        return {std::move(rows)};
     }
 
-    QStringList files() const override { return readsStandardInput() ? QStringList() : QStringList(file_); }
-    bool isAllInFiles() const override { return !readsStandardInput(); }
-    bool hasOwnUnits() const override { return true; }
-    bool readsStandardInput() const override { return file_ == u"-"; }
-
-private:
-    QString file_;
     LandXmlQuery query_;
     bool isInFileUnits_;
 };

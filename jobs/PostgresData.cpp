@@ -1,6 +1,5 @@
-#include "PostgresData.h"
-
 #include "ColumnChoices.h"
+#include "DataKinds.h"
 #include "PostgresObjectList.h"
 #include "Xlate.h"
 
@@ -17,12 +16,10 @@ public:
 
     Expected<std::unique_ptr<RowList>> open(const DataRequest &request) const override
     {
-        auto rows = std::make_unique<PostgresObjectList>(query_, request.variables(),
+        auto rows = std::make_unique<PostgresObjectList>(request.files.connection(query_.connection), query_,
+                                                         request.variables(),
                                                          request.beginReading(QStringLiteral("PostgreSQL"), 0));
-        if (auto error = whyNotOpened(*rows, request)) {
-            return *std::move(error);
-        }
-        return {std::move(rows)};
+        return openedRows(std::move(rows), request);
     }
 
     bool isAllInFiles() const override { return false; }
@@ -43,8 +40,11 @@ std::vector<std::optional<QString>> readParameters(const JsonNode &node)
         case QJsonValue::Bool:
             parameters.emplace_back(value.toBool() ? QStringLiteral("true") : QStringLiteral("false"));
             break;
+        // What was set on the command line is the text as it was given there, such as 1.50 or 007.
         case QJsonValue::Double:
-        case QJsonValue::String: parameters.emplace_back(value.toVariant().toString()); break;
+            parameters.emplace_back(parameter.givenText().value_or(value.toVariant().toString()));
+            break;
+        case QJsonValue::String: parameters.emplace_back(readWholeText(parameter)); break;
         default: parameter.fail(Xlate("a text, a number, true, false or null was expected")); break;
         }
     }
@@ -54,8 +54,8 @@ std::vector<std::optional<QString>> readParameters(const JsonNode &node)
 std::shared_ptr<const DataSource> read(const JsonNode &set, const QDir & /*folder*/)
 {
     PostgresQuery query;
-    query.connection = set[QStringLiteral("postgresql")].text();
-    query.query = set[QStringLiteral("query")].text();
+    query.connection = readWholeText(set[QStringLiteral("postgresql")]);
+    query.query = readWholeText(set[QStringLiteral("query")]);
     query.parameters = readParameters(set[QStringLiteral("parameters")]);
     query.columns = readColumnChoices(set[QStringLiteral("columns")]);
     if (query.query.isEmpty()) {

@@ -24,7 +24,7 @@ Expected<SavedText> readPlain(const QString &path, QByteArrayView bytes)
     }
     SavedText saved;
     if (const auto place = decodeReportText(bytes, saved.text)) {
-        return InputError{path, *place, Xlate("a report file was expected; this is no UTF-8")};
+        return InputError{path, *place, Xlate("a report file was expected; this is not UTF-8")};
     }
     return saved;
 }

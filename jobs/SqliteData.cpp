@@ -1,6 +1,5 @@
-#include "SqliteData.h"
-
 #include "ColumnChoices.h"
+#include "DataKinds.h"
 #include "JobFileName.h"
 #include "SqliteObjectList.h"
 #include "Xlate.h"
@@ -23,12 +22,13 @@ public:
         if (!QFileInfo::exists(query_.file)) {
             return request.errorAt(QStringLiteral("sqlite"), Xlate("there is no database \"%1\"").arg(query_.file));
         }
-        auto rows = std::make_unique<SqliteObjectList>(query_, request.variables(),
-                                                       request.beginReading(QFileInfo(query_.file).fileName(), 0));
-        if (auto error = whyNotOpened(*rows, request)) {
-            return *std::move(error);
+        auto &file = request.files.database(query_.file);
+        if (!file) {
+            file = SqliteObjectList::openFile(query_.file);
         }
-        return {std::move(rows)};
+        auto rows = std::make_unique<SqliteObjectList>(file, query_, request.variables(),
+                                                       request.beginReading(QFileInfo(query_.file).fileName(), 0));
+        return openedRows(std::move(rows), request);
     }
 
     QStringList files() const override
@@ -50,8 +50,8 @@ std::shared_ptr<const DataSource> read(const JsonNode &set, const QDir &folder)
 {
     SqliteQuery query;
     query.file = folder.filePath(readFileName(set[QStringLiteral("sqlite")]));
-    query.table = set[QStringLiteral("table")].text();
-    query.query = set[QStringLiteral("query")].text();
+    query.table = readWholeText(set[QStringLiteral("table")]);
+    query.query = readWholeText(set[QStringLiteral("query")]);
     query.columns = readColumnChoices(set[QStringLiteral("columns")]);
     if (query.table.isEmpty() == query.query.isEmpty()) {
         set.fail(Xlate("either \"table\" or \"query\" was expected"));

@@ -1,6 +1,5 @@
-#include "ValuesData.h"
-
 #include "CsvOptions.h"
+#include "DataKinds.h"
 #include "JsonObjectList.h"
 #include "Xlate.h"
 

@@ -897,7 +897,7 @@
     </message>
     <message>
         <location filename="../sources/FileBytesPosix.cpp"/>
-        <source>more than %1 MB come out of what is no file</source>
+        <source>the pipe or device gives more than %1 MB, the most that was expected</source>
         <translation>mehr als %1 MB kommen aus einer Quelle, die keine Datei ist</translation>
     </message>
     <message>
@@ -907,7 +907,7 @@
     </message>
     <message>
         <location filename="../sources/PointGeometry.cpp"/>
-        <source>bytes that are no geometry</source>
+        <source>bytes that are not a geometry</source>
         <translation>Bytes, die keine Geometrie sind</translation>
     </message>
     <message>
@@ -962,7 +962,7 @@
     </message>
     <message>
         <location filename="../sources/TextEncoding.cpp"/>
-        <source>the file is not Windows-1252: it has a byte that is no character there</source>
+        <source>the file is not Windows-1252: it has a byte that stands for no character</source>
         <translation>die Datei ist nicht Windows-1252: sie hat ein Byte, das dort kein Zeichen ist</translation>
     </message>
     <message>
@@ -1037,12 +1037,12 @@
     </message>
     <message>
         <location filename="../sources/csv/CsvReader.cpp"/>
-        <source>a quote inside a cell was not expected: the whole cell must stand in quotes and the quote be doubled</source>
+        <source>a quote inside a cell was not expected: put the whole cell in quotes and double the quote</source>
         <translation>ein Anführungszeichen in einer Zelle wurde nicht erwartet: die ganze Zelle muss in Anführungszeichen stehen und das Zeichen selbst doppelt</translation>
     </message>
     <message>
         <location filename="../sources/csv/CsvReader.cpp"/>
-        <source>a zero byte stands in the file: a text file was expected</source>
+        <source>the file contains a zero byte: a text file was expected</source>
         <translation>die Datei enthält ein Nullbyte: eine Textdatei wurde erwartet</translation>
     </message>
     <message>
@@ -1062,7 +1062,12 @@
     </message>
     <message>
         <location filename="../sources/csv/CsvRows.cpp"/>
-        <source>"%1" is no order of columns: each of the letters P, N, E, Z and D at most once, and - for a column that is passed over, was expected, such as PNEZD</source>
+        <source>the header row holds values that fit the columns, and would be lost if it is data: "header": false (--no-header) was expected, with "skip" for lines that are not data</source>
+        <translation>die Kopfzeile enthält Werte, die zu den Spalten passen, und ginge verloren, wenn sie Daten ist: "header": false (--no-header) wurde erwartet, mit "skip" für Zeilen, die keine Daten sind</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRows.cpp"/>
+        <source>"%1" is not an order of columns: each of the letters P, N, E, Z and D at most once, and - for a column that is passed over, was expected, such as PNEZD</source>
         <translation>"%1" ist keine Reihenfolge von Spalten: erwartet wurden die Buchstaben P, N, E, Z und D je höchstens einmal, und - für eine Spalte, die übergangen wird, wie PNEZD</translation>
     </message>
     <message>
@@ -1132,6 +1137,11 @@
     </message>
     <message>
         <location filename="../sources/csv/DelimiterGuess.cpp"/>
+        <source>with %1, in line %2: %3</source>
+        <translation>mit %1, in Zeile %2: %3</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/DelimiterGuess.cpp"/>
         <source>the delimiter cannot be found out: it may be %1. The delimiter itself was expected</source>
         <translation>das Trennzeichen ist nicht zu ermitteln: möglich sind %1. Das Trennzeichen selbst wurde erwartet</translation>
     </message>
@@ -1153,7 +1163,7 @@
     </message>
     <message>
         <location filename="../sources/json/JsonFileRows.cpp"/>
-        <source>the end of the line was expected: each object stands in a line of its own</source>
+        <source>the end of the line was expected: each object has a line of its own</source>
         <translation>das Ende der Zeile wurde erwartet: jedes Objekt steht in einer eigenen Zeile</translation>
     </message>
     <message>
@@ -1173,17 +1183,17 @@
     </message>
     <message>
         <location filename="../sources/json/JsonFileRows.cpp"/>
-        <source>the key "%1" stands twice in an object</source>
+        <source>the key "%1" occurs twice in an object</source>
         <translation>der Schlüssel "%1" steht zweimal in einem Objekt</translation>
     </message>
     <message>
         <location filename="../sources/json/JsonFileRows.cpp"/>
-        <source>the variable "%1" stands twice: each variable was expected once</source>
+        <source>the variable "%1" occurs twice: each variable was expected once</source>
         <translation>die Variable „%1“ kommt zweimal vor: jede Variable wurde nur einmal erwartet</translation>
     </message>
     <message>
         <location filename="../sources/json/JsonFileRows.cpp"/>
-        <source>this is no JSON: %1</source>
+        <source>this is not JSON: %1</source>
         <translation>das ist kein JSON: %1</translation>
     </message>
     <message>
@@ -1563,7 +1573,12 @@
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresConnection.cpp"/>
-        <source>this is no connection: %1. Words such as service=survey, host=..., port=..., dbname=... and user=... were expected</source>
+        <source>the library libpq cannot be loaded: the package libpq5 was expected</source>
+        <translation>die Bibliothek libpq kann nicht geladen werden: das Paket libpq5 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
+        <source>this is not a connection: %1. Words such as service=survey, host=..., port=..., dbname=... and user=... were expected</source>
         <translation>das ist keine Verbindung: %1. Erwartet wurden Angaben wie service=survey, host=..., port=..., dbname=... und user=...</translation>
     </message>
     <message>
@@ -1618,6 +1633,11 @@
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresRows.cpp"/>
+        <source>%1 bytes</source>
+        <translation>%1 Bytes</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresRows.cpp"/>
         <source>there is %1: a point was expected</source>
         <translation>es steht dort %1: ein Punkt wurde erwartet</translation>
     </message>
@@ -1643,7 +1663,7 @@
     </message>
     <message>
         <location filename="../sources/sqlite/SqliteFile.cpp"/>
-        <source>the file is no SQLite database, or it is encrypted</source>
+        <source>the file is not a SQLite database, or it is encrypted</source>
         <translation>die Datei ist keine SQLite-Datenbank, oder sie ist verschlüsselt</translation>
     </message>
     <message>
@@ -1682,19 +1702,24 @@
         <translation>die Datenbank hat keine Tabelle "%1"</translation>
     </message>
     <message>
-        <location filename="../sources/sqlite/SqliteRows.cpp"/>
-        <source>%1 bytes</source>
-        <translation>%1 Bytes</translation>
-    </message>
-    <message>
         <location filename="../jobs/ColumnChoices.cpp"/>
         <source>the name of a column, or its number from 1, was expected</source>
         <translation>der Name einer Spalte oder ihre Nummer ab 1 wurde erwartet</translation>
     </message>
     <message>
+        <location filename="../jobs/ColumnChoices.cpp"/>
+        <source>a text without a zero character was expected</source>
+        <translation>ein Text ohne das Zeichen 0 wurde erwartet</translation>
+    </message>
+    <message>
         <location filename="../jobs/ColumnNotes.cpp"/>
         <source>the column "%1" is no variable of the dictionary "%2"</source>
         <translation>die Spalte „%1“ ist keine Variable des Wörterbuchs „%2“</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ColumnNotes.cpp"/>
+        <source>%1 more columns are not variables of the dictionary "%2"</source>
+        <translation>%1 weitere Spalten sind keine Variablen des Wörterbuchs "%2"</translation>
     </message>
     <message>
         <location filename="../jobs/CsvData.cpp"/>
@@ -1708,6 +1733,11 @@
     </message>
     <message>
         <location filename="../jobs/CsvOptions.cpp"/>
+        <source>the character is that of "%1": another one was expected</source>
+        <translation>das Zeichen ist das von "%1": ein anderes wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/CsvOptions.cpp"/>
         <source>the names of the columns in their order were expected</source>
         <translation>die Namen der Spalten in ihrer Reihenfolge wurden erwartet</translation>
     </message>
@@ -1718,8 +1748,8 @@
     </message>
     <message>
         <location filename="../jobs/CsvOptions.cpp"/>
-        <source>a text of one ASCII character that is neither a quote nor a line end, or one of %1, was expected</source>
-        <translation>ein Text aus einem ASCII-Zeichen, das weder Anführungszeichen noch Zeilenende ist, oder eines von %1 wurde erwartet</translation>
+        <source>one ASCII character that is not a letter, a digit, a sign, a quote or a line end, or one of %1, was expected</source>
+        <translation>ein ASCII-Zeichen, das kein Buchstabe, keine Ziffer, kein Vorzeichen, kein Anführungszeichen und kein Zeilenende ist, oder eines von %1 wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/CsvOptions.cpp"/>
@@ -1733,8 +1763,8 @@
     </message>
     <message>
         <location filename="../jobs/CsvOptions.cpp"/>
-        <source>a text of one ASCII character that is neither a quote nor a line end was expected</source>
-        <translation>ein Text aus einem ASCII-Zeichen, das weder Anführungszeichen noch Zeilenende ist, wurde erwartet</translation>
+        <source>one ASCII character that is not a letter, a digit, a sign, a quote or a line end was expected</source>
+        <translation>ein ASCII-Zeichen, das kein Buchstabe, keine Ziffer, kein Vorzeichen, kein Anführungszeichen und kein Zeilenende ist, wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/DataFiles.cpp"/>
@@ -1843,7 +1873,7 @@
     </message>
     <message>
         <location filename="../jobs/JobReader.cpp"/>
-        <source>the ending of "%1" says no kind: the key "as" with one of %2 was expected</source>
+        <source>the ending of "%1" does not say the kind: the key "as" with one of %2 was expected</source>
         <translation>die Endung von „%1“ nennt keine Art: der Schlüssel "as" mit einem dieser Werte wurde erwartet: %2</translation>
     </message>
     <message>
@@ -1882,6 +1912,56 @@
         <translation>ein Zeichen mit einem Code bis 255 oder ein leerer Text wurde erwartet</translation>
     </message>
     <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>the data "%1" does not say the unit of its numbers: %2 was taken</source>
+        <translation>die Daten „%1“ sagen die Einheit ihrer Zahlen nicht: %2 wurde angenommen</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>the field "%1" of the %2 "%3" is not a variable of the dictionary "%4"</source>
+        <translation>das Feld „%1“ (%2 „%3“) ist keine Variable des Wörterbuchs „%4“</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>no column fills the field "%1" of the %2 "%3"</source>
+        <translation>keine Spalte füllt das Feld „%1“ (%2 „%3“)</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>"%1" has the same ID and shows there</source>
+        <translation>"%1" hat dieselbe ID und wird dort gezeigt</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>the sort key "%1" of the table "%2" is not a variable of the dictionary "%3"</source>
+        <translation>der Sortierschlüssel "%1" der Tabelle "%2" ist keine Variable des Wörterbuchs "%3"</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values are wider than the field "%2" of the %3 "%4" and show as #, the first one in row %5, line %6 of the report</source>
+        <translation>%1 Werte sind breiter als das Feld "%2" (%3 "%4") und erscheinen als #, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values are wider than the field "%2" of the %3 "%4", the first one in row %5, line %6 of the report</source>
+        <translation>%1 Werte sind breiter als das Feld "%2" (%3 "%4"), der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values of the field "%2" of the %3 "%4" are infinite or not a number, the first one in row %5, line %6 of the report</source>
+        <translation>%1 Werte des Felds "%2" (%3 "%4") sind unendlich oder keine Zahl, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as 0, the first one in row %5, line %6 of the report</source>
+        <translation>%1 Werte des Felds "%2" (%3 "%4") fehlen und erscheinen als 0, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as blanks, the first one in row %5, line %6 of the report</source>
+        <translation>%1 Werte des Felds "%2" (%3 "%4") fehlen und erscheinen als Leerzeichen, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
         <location filename="../jobs/JobSteps.cpp"/>
         <source>block</source>
         <translation>Block</translation>
@@ -1905,36 +1985,6 @@
         <location filename="../jobs/JobSteps.cpp"/>
         <source>the %1 "%2" cannot be written: the format of its field "%3" is beyond %4 characters</source>
         <translation>%1 „%2“ kann nicht geschrieben werden: das Format des Felds „%3“ geht über %4 Zeichen hinaus</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobSteps.cpp"/>
-        <source>no column fills the field "%1" of the %2 "%3"</source>
-        <translation>keine Spalte füllt das Feld „%1“ (%2 „%3“)</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobSteps.cpp"/>
-        <source>the field "%1" of the %2 "%3" is not a variable of the dictionary "%4"</source>
-        <translation>das Feld „%1“ (%2 „%3“) ist keine Variable des Wörterbuchs „%4“</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobSteps.cpp"/>
-        <source>the data "%1" does not say the unit of its numbers: %2 was taken</source>
-        <translation>die Daten „%1“ sagen die Einheit ihrer Zahlen nicht: %2 wurde angenommen</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobSteps.cpp"/>
-        <source>%1 values are wider than the field "%2" of the table "%3" and show as #, the first one in row %4, line %5 of the report</source>
-        <translation>%1 Werte sind breiter als das Feld „%2“ der Tabelle „%3“ und erscheinen als #, der erste in Reihe %4, Zeile %5 des Berichts</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobSteps.cpp"/>
-        <source>%1 values are wider than the field "%2" of the table "%3", the first one in row %4, line %5 of the report</source>
-        <translation>%1 Werte sind breiter als das Feld „%2“ der Tabelle „%3“, der erste in Reihe %4, Zeile %5 des Berichts</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobSteps.cpp"/>
-        <source>%1 values of the field "%2" of the table "%3" are missing and show as 0, the first one in row %4, line %5 of the report</source>
-        <translation>%1 Werte des Felds „%2“ der Tabelle „%3“ fehlen und erscheinen als 0, der erste in Reihe %4, Zeile %5 des Berichts</translation>
     </message>
     <message>
         <location filename="../jobs/JobStepsReader.cpp"/>
@@ -1993,7 +2043,7 @@
     </message>
     <message>
         <location filename="../jobs/JsonSource.cpp"/>
-        <source>the key "%1" stands twice in "%2"</source>
+        <source>the key "%1" occurs twice in "%2"</source>
         <translation>der Schlüssel „%1“ kommt in „%2“ zweimal vor</translation>
     </message>
     <message>
@@ -2018,7 +2068,7 @@
     </message>
     <message>
         <location filename="../jobs/JsonSource.cpp"/>
-        <source>the key "%1" stands in line %2 already: each key was expected once</source>
+        <source>the key "%1" is in line %2 already: each key was expected once</source>
         <translation>der Schlüssel „%1“ steht schon in Zeile %2: jeder Schlüssel wurde nur einmal erwartet</translation>
     </message>
     <message>
@@ -2073,7 +2123,7 @@
     </message>
     <message>
         <location filename="../jobs/SavedText.cpp"/>
-        <source>a report file was expected; this is no UTF-8</source>
+        <source>a report file was expected; this is not UTF-8</source>
         <translation>eine Berichtsdatei wurde erwartet; dies ist kein UTF-8-Text</translation>
     </message>
     <message>
@@ -2183,7 +2233,7 @@
     </message>
     <message>
         <location filename="../apps/kareport/CommandSetup.cpp"/>
-        <source>the ending of "%1" says no kind: --as with one of %2 was expected</source>
+        <source>the ending of "%1" does not say the kind: --as with one of %2 was expected</source>
         <translation>die Endung von „%1“ nennt keine Art: --as mit einem dieser Werte wurde erwartet: %2</translation>
     </message>
     <message>
@@ -2210,6 +2260,11 @@
         <location filename="../apps/kareport/DataOptions.cpp"/>
         <source>--units "%1": QUANTITY=UNIT was expected, as in length=usft</source>
         <translation>--units "%1": GRÖSSE=EINHEIT wurde erwartet, wie in length=usft</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/DataOptions.cpp"/>
+        <source>%1: "%2" was given twice: each was expected once</source>
+        <translation>%1: "%2" wurde zweimal angegeben: jedes wurde einmal erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/DataOptions.cpp"/>

@@ -897,7 +897,7 @@
     </message>
     <message>
         <location filename="../sources/FileBytesPosix.cpp"/>
-        <source>more than %1 MB come out of what is no file</source>
+        <source>the pipe or device gives more than %1 MB, the most that was expected</source>
         <translation>ファイルではない入力から %1 MB を超えるデータが読み込まれました</translation>
     </message>
     <message>
@@ -907,7 +907,7 @@
     </message>
     <message>
         <location filename="../sources/PointGeometry.cpp"/>
-        <source>bytes that are no geometry</source>
+        <source>bytes that are not a geometry</source>
         <translation>ジオメトリでないバイト列</translation>
     </message>
     <message>
@@ -962,7 +962,7 @@
     </message>
     <message>
         <location filename="../sources/TextEncoding.cpp"/>
-        <source>the file is not Windows-1252: it has a byte that is no character there</source>
+        <source>the file is not Windows-1252: it has a byte that stands for no character</source>
         <translation>ファイルは Windows-1252 ではありません: 文字でないバイトがあります</translation>
     </message>
     <message>
@@ -1037,12 +1037,12 @@
     </message>
     <message>
         <location filename="../sources/csv/CsvReader.cpp"/>
-        <source>a quote inside a cell was not expected: the whole cell must stand in quotes and the quote be doubled</source>
+        <source>a quote inside a cell was not expected: put the whole cell in quotes and double the quote</source>
         <translation>セルの途中に引用符は使えません: セル全体を引用符で囲み、中の引用符を 2 つ重ねる必要があります</translation>
     </message>
     <message>
         <location filename="../sources/csv/CsvReader.cpp"/>
-        <source>a zero byte stands in the file: a text file was expected</source>
+        <source>the file contains a zero byte: a text file was expected</source>
         <translation>ファイルにヌルバイトがあります: テキストファイルが必要です</translation>
     </message>
     <message>
@@ -1062,7 +1062,12 @@
     </message>
     <message>
         <location filename="../sources/csv/CsvRows.cpp"/>
-        <source>"%1" is no order of columns: each of the letters P, N, E, Z and D at most once, and - for a column that is passed over, was expected, such as PNEZD</source>
+        <source>the header row holds values that fit the columns, and would be lost if it is data: "header": false (--no-header) was expected, with "skip" for lines that are not data</source>
+        <translation>見出し行に列に合う値があります。データであれば失われます: "header": false (--no-header)、データでない行には "skip" が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRows.cpp"/>
+        <source>"%1" is not an order of columns: each of the letters P, N, E, Z and D at most once, and - for a column that is passed over, was expected, such as PNEZD</source>
         <translation>"%1" は列の順序ではありません: 文字 P、N、E、Z、D をそれぞれ 1 回まで、読み飛ばす列には - を使い、PNEZD のように指定する必要があります</translation>
     </message>
     <message>
@@ -1132,6 +1137,11 @@
     </message>
     <message>
         <location filename="../sources/csv/DelimiterGuess.cpp"/>
+        <source>with %1, in line %2: %3</source>
+        <translation>%1 の場合、%2 行目: %3</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/DelimiterGuess.cpp"/>
         <source>the delimiter cannot be found out: it may be %1. The delimiter itself was expected</source>
         <translation>区切り文字を特定できません: %1 の可能性があります。区切り文字そのものが必要です</translation>
     </message>
@@ -1153,7 +1163,7 @@
     </message>
     <message>
         <location filename="../sources/json/JsonFileRows.cpp"/>
-        <source>the end of the line was expected: each object stands in a line of its own</source>
+        <source>the end of the line was expected: each object has a line of its own</source>
         <translation>行の終わりが必要です: 各オブジェクトはそれぞれの行に置かれます</translation>
     </message>
     <message>
@@ -1173,17 +1183,17 @@
     </message>
     <message>
         <location filename="../sources/json/JsonFileRows.cpp"/>
-        <source>the key "%1" stands twice in an object</source>
+        <source>the key "%1" occurs twice in an object</source>
         <translation>キー "%1" がオブジェクトに 2 回あります</translation>
     </message>
     <message>
         <location filename="../sources/json/JsonFileRows.cpp"/>
-        <source>the variable "%1" stands twice: each variable was expected once</source>
+        <source>the variable "%1" occurs twice: each variable was expected once</source>
         <translation>変数「%1」が 2 回あります: 変数はそれぞれ 1 回だけ指定できます</translation>
     </message>
     <message>
         <location filename="../sources/json/JsonFileRows.cpp"/>
-        <source>this is no JSON: %1</source>
+        <source>this is not JSON: %1</source>
         <translation>これは JSON ではありません: %1</translation>
     </message>
     <message>
@@ -1563,7 +1573,12 @@
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresConnection.cpp"/>
-        <source>this is no connection: %1. Words such as service=survey, host=..., port=..., dbname=... and user=... were expected</source>
+        <source>the library libpq cannot be loaded: the package libpq5 was expected</source>
+        <translation>ライブラリ libpq を読み込めません: パッケージ libpq5 が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
+        <source>this is not a connection: %1. Words such as service=survey, host=..., port=..., dbname=... and user=... were expected</source>
         <translation>これは接続ではありません: %1。service=survey、host=...、port=...、dbname=...、user=... のような語が必要です</translation>
     </message>
     <message>
@@ -1618,6 +1633,11 @@
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresRows.cpp"/>
+        <source>%1 bytes</source>
+        <translation>%1 バイト</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresRows.cpp"/>
         <source>there is %1: a point was expected</source>
         <translation>%1 があります: 点が必要です</translation>
     </message>
@@ -1643,7 +1663,7 @@
     </message>
     <message>
         <location filename="../sources/sqlite/SqliteFile.cpp"/>
-        <source>the file is no SQLite database, or it is encrypted</source>
+        <source>the file is not a SQLite database, or it is encrypted</source>
         <translation>ファイルは SQLite データベースではないか、暗号化されています</translation>
     </message>
     <message>
@@ -1682,19 +1702,24 @@
         <translation>データベースに表 "%1" はありません</translation>
     </message>
     <message>
-        <location filename="../sources/sqlite/SqliteRows.cpp"/>
-        <source>%1 bytes</source>
-        <translation>%1 バイト</translation>
-    </message>
-    <message>
         <location filename="../jobs/ColumnChoices.cpp"/>
         <source>the name of a column, or its number from 1, was expected</source>
         <translation>列の名前、または 1 から始まる番号が必要です</translation>
     </message>
     <message>
+        <location filename="../jobs/ColumnChoices.cpp"/>
+        <source>a text without a zero character was expected</source>
+        <translation>文字 0 を含まない文字列が必要です</translation>
+    </message>
+    <message>
         <location filename="../jobs/ColumnNotes.cpp"/>
         <source>the column "%1" is no variable of the dictionary "%2"</source>
         <translation>列「%1」は辞書「%2」の変数ではありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ColumnNotes.cpp"/>
+        <source>%1 more columns are not variables of the dictionary "%2"</source>
+        <translation>さらに %1 列が辞書 "%2" の変数ではありません</translation>
     </message>
     <message>
         <location filename="../jobs/CsvData.cpp"/>
@@ -1708,6 +1733,11 @@
     </message>
     <message>
         <location filename="../jobs/CsvOptions.cpp"/>
+        <source>the character is that of "%1": another one was expected</source>
+        <translation>この文字は "%1" の文字です: 別の文字が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/CsvOptions.cpp"/>
         <source>the names of the columns in their order were expected</source>
         <translation>列の名前を順に並べたものが必要です</translation>
     </message>
@@ -1718,8 +1748,8 @@
     </message>
     <message>
         <location filename="../jobs/CsvOptions.cpp"/>
-        <source>a text of one ASCII character that is neither a quote nor a line end, or one of %1, was expected</source>
-        <translation>引用符でも改行でもない ASCII 1 文字、または %1 のいずれかが必要です</translation>
+        <source>one ASCII character that is not a letter, a digit, a sign, a quote or a line end, or one of %1, was expected</source>
+        <translation>英字、数字、符号、引用符、改行以外の ASCII 文字 1 つ、または %1 のいずれかが必要です</translation>
     </message>
     <message>
         <location filename="../jobs/CsvOptions.cpp"/>
@@ -1733,8 +1763,8 @@
     </message>
     <message>
         <location filename="../jobs/CsvOptions.cpp"/>
-        <source>a text of one ASCII character that is neither a quote nor a line end was expected</source>
-        <translation>引用符と改行を除く ASCII 1 文字のテキストが必要です</translation>
+        <source>one ASCII character that is not a letter, a digit, a sign, a quote or a line end was expected</source>
+        <translation>英字、数字、符号、引用符、改行以外の ASCII 文字 1 つが必要です</translation>
     </message>
     <message>
         <location filename="../jobs/DataFiles.cpp"/>
@@ -1843,7 +1873,7 @@
     </message>
     <message>
         <location filename="../jobs/JobReader.cpp"/>
-        <source>the ending of "%1" says no kind: the key "as" with one of %2 was expected</source>
+        <source>the ending of "%1" does not say the kind: the key "as" with one of %2 was expected</source>
         <translation>「%1」の拡張子からは種類がわかりません: キー "as" に次のいずれかを指定する必要があります: %2</translation>
     </message>
     <message>
@@ -1882,6 +1912,56 @@
         <translation>文字コード 255 以下の 1 文字または空のテキストが必要です</translation>
     </message>
     <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>the data "%1" does not say the unit of its numbers: %2 was taken</source>
+        <translation>データ「%1」は数値の単位を示していません: %2 とみなしました</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>the field "%1" of the %2 "%3" is not a variable of the dictionary "%4"</source>
+        <translation>%2「%3」の項目「%1」は辞書「%4」の変数ではありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>no column fills the field "%1" of the %2 "%3"</source>
+        <translation>%2「%3」の項目「%1」に対応する列がありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>"%1" has the same ID and shows there</source>
+        <translation>"%1" が同じ ID を持ち、そこに表示されます</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>the sort key "%1" of the table "%2" is not a variable of the dictionary "%3"</source>
+        <translation>表 "%2" の並べ替えキー "%1" は辞書 "%3" の変数ではありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values are wider than the field "%2" of the %3 "%4" and show as #, the first one in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" より幅の広い値が %1 個あり、# で表示されます。最初はデータの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values are wider than the field "%2" of the %3 "%4", the first one in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" より幅の広い値が %1 個あります。最初はデータの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values of the field "%2" of the %3 "%4" are infinite or not a number, the first one in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" の値 %1 個が無限大または非数です。最初はデータの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as 0, the first one in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" の値が %1 個なく、0 と表示されます。最初はデータの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as blanks, the first one in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" の値が %1 個なく、空白で表示されます。最初はデータの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
         <location filename="../jobs/JobSteps.cpp"/>
         <source>block</source>
         <translation>ブロック</translation>
@@ -1905,36 +1985,6 @@
         <location filename="../jobs/JobSteps.cpp"/>
         <source>the %1 "%2" cannot be written: the format of its field "%3" is beyond %4 characters</source>
         <translation>%1「%2」は出力できません: フィールド「%3」の書式が %4 文字を超えています</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobSteps.cpp"/>
-        <source>no column fills the field "%1" of the %2 "%3"</source>
-        <translation>%2「%3」の項目「%1」に対応する列がありません</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobSteps.cpp"/>
-        <source>the field "%1" of the %2 "%3" is not a variable of the dictionary "%4"</source>
-        <translation>%2「%3」の項目「%1」は辞書「%4」の変数ではありません</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobSteps.cpp"/>
-        <source>the data "%1" does not say the unit of its numbers: %2 was taken</source>
-        <translation>データ「%1」は数値の単位を示していません: %2 とみなしました</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobSteps.cpp"/>
-        <source>%1 values are wider than the field "%2" of the table "%3" and show as #, the first one in row %4, line %5 of the report</source>
-        <translation>%1 個の値が表「%3」の項目「%2」より長く、# で表示されます。最初は行 %4、レポートの %5 行目です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobSteps.cpp"/>
-        <source>%1 values are wider than the field "%2" of the table "%3", the first one in row %4, line %5 of the report</source>
-        <translation>%1 個の値が表「%3」の項目「%2」より長くなっています。最初は行 %4、レポートの %5 行目です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobSteps.cpp"/>
-        <source>%1 values of the field "%2" of the table "%3" are missing and show as 0, the first one in row %4, line %5 of the report</source>
-        <translation>表「%3」の項目「%2」の値が %1 個なく、0 と表示されます。最初は行 %4、レポートの %5 行目です</translation>
     </message>
     <message>
         <location filename="../jobs/JobStepsReader.cpp"/>
@@ -1993,7 +2043,7 @@
     </message>
     <message>
         <location filename="../jobs/JsonSource.cpp"/>
-        <source>the key "%1" stands twice in "%2"</source>
+        <source>the key "%1" occurs twice in "%2"</source>
         <translation>キー「%1」が「%2」に 2 回あります</translation>
     </message>
     <message>
@@ -2018,7 +2068,7 @@
     </message>
     <message>
         <location filename="../jobs/JsonSource.cpp"/>
-        <source>the key "%1" stands in line %2 already: each key was expected once</source>
+        <source>the key "%1" is in line %2 already: each key was expected once</source>
         <translation>キー「%1」はすでに %2 行目にあります: キーはそれぞれ 1 回だけ指定できます</translation>
     </message>
     <message>
@@ -2073,7 +2123,7 @@
     </message>
     <message>
         <location filename="../jobs/SavedText.cpp"/>
-        <source>a report file was expected; this is no UTF-8</source>
+        <source>a report file was expected; this is not UTF-8</source>
         <translation>帳票ファイルが必要です。これは UTF-8 ではありません</translation>
     </message>
     <message>
@@ -2183,7 +2233,7 @@
     </message>
     <message>
         <location filename="../apps/kareport/CommandSetup.cpp"/>
-        <source>the ending of "%1" says no kind: --as with one of %2 was expected</source>
+        <source>the ending of "%1" does not say the kind: --as with one of %2 was expected</source>
         <translation>「%1」の拡張子からは種類がわかりません: --as に次のいずれかを指定する必要があります: %2</translation>
     </message>
     <message>
@@ -2210,6 +2260,11 @@
         <location filename="../apps/kareport/DataOptions.cpp"/>
         <source>--units "%1": QUANTITY=UNIT was expected, as in length=usft</source>
         <translation>--units "%1": length=usft のような 量=単位 が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/DataOptions.cpp"/>
+        <source>%1: "%2" was given twice: each was expected once</source>
+        <translation>%1: "%2" が 2 回指定されています: それぞれ 1 回だけ必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/DataOptions.cpp"/>

@@ -17,6 +17,7 @@
 #include <QFileInfo>
 
 #include <algorithm>
+#include <new>
 
 namespace kareport
 {
@@ -176,21 +177,21 @@ std::optional<InputError> CommandLineJob::make(JobRunner &runner, UReportDoc &re
     }
     auto error = runner.run(report, stream);
     if (!isInterrupted() && !isReaderGone()) {
-        sayNotes(runner.notes());
+        sayNotes(runner.notes(), error);
     }
     return error;
 }
 
-void CommandLineJob::sayNotes(const JobNotes &notes)
+void CommandLineJob::sayNotes(const JobNotes &notes, const std::optional<InputError> &error)
 {
     const bool isStrict = command_.strict || job_.strict;
-    // Of notes that are errors the first one is said as the error that ends the job.
-    const std::vector<JobNote> said = notes.said();
-    for (std::size_t i = isStrict ? 1 : 0; i < said.size(); ++i) {
-        const JobNote &note = said[i];
-        if (isStrict || !command_.quiet) {
+    for (const JobNote &note : notes.said()) {
+        const bool isError = isStrict && note.isMistake();
+        // One of the notes that are errors is the error that ends the job, which is said after them.
+        const bool endsJob = isError && error && error->message() == note.about.message();
+        if (!endsJob && (isError || !command_.quiet)) {
             eraseProgress();
-            printError(isStrict ? note.about.message() : note.message());
+            printError(isError ? note.about.message() : note.message());
         }
     }
     areNotesWritten_ = !command_.notes || writeNotes(notes);
@@ -228,6 +229,9 @@ std::optional<ExitStatus> CommandLineJob::runIntoOutput(JobRunner &runner, URepo
         }
         isMade = true;
         const bool isWritten = report.EndTextStream(writer);
+        if (!isWritten && writer.lacksMemory()) {
+            throw std::bad_alloc(); // the output itself is sound
+        }
         isEmpty = isWritten && writer.isEmpty();
         return isWritten && !(isEmpty && isReport);
     });

@@ -33,7 +33,7 @@ private:
     std::optional<ExitStatus> runIntoOutput(JobRunner &runner, UReportDoc &report, const Output &output,
                                             Progress &progress);
     std::optional<InputError> make(JobRunner &runner, UReportDoc &report, ReportTextWriter *stream);
-    void sayNotes(const JobNotes &notes);
+    void sayNotes(const JobNotes &notes, const std::optional<InputError> &error);
     ExitStatus withNotes(ExitStatus status) const;
     bool writeNotes(const JobNotes &notes);
     QString notesFile() const;

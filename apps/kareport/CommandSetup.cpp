@@ -20,7 +20,7 @@ std::optional<QString> wrongKindName(const QString &as)
 std::optional<QString> wrongOutput(const QString &file, const QString &as)
 {
     if (!outputKindOf(file, outputKindFromName(as))) {
-        return Xlate("the ending of \"%1\" says no kind: --as with one of %2 was expected")
+        return Xlate("the ending of \"%1\" does not say the kind: --as with one of %2 was expected")
             .arg(file, outputKindNames());
     }
     return std::nullopt;

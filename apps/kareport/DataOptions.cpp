@@ -51,6 +51,20 @@ QJsonValue columnsOf(const QStringList &parts)
     return columns;
 }
 
+/// The first name of NAME=VALUE that was given before; empty for none.
+QString repeatedName(const QStringList &parts)
+{
+    QStringList names;
+    for (const QString &part : parts) {
+        const QString name = part.left(part.indexOf(u'=')).toCaseFolded();
+        if (names.contains(name)) {
+            return part.left(part.indexOf(u'='));
+        }
+        names.append(name);
+    }
+    return {};
+}
+
 QJsonObject unitsOf(const QStringList &parts)
 {
     QJsonObject units;
@@ -65,10 +79,15 @@ QJsonObject unitsOf(const QStringList &parts)
 
 std::optional<QString> DataOptions::usageError() const
 {
-    for (const QString &part : partsOf(units)) {
+    const QStringList unitParts = partsOf(units);
+    for (const QString &part : unitParts) {
         if (part.indexOf(u'=') < 1) {
             return Xlate("--units \"%1\": QUANTITY=UNIT was expected, as in length=usft").arg(part);
         }
+    }
+    const QString twice = Xlate("%1: \"%2\" was given twice: each was expected once");
+    if (const QString name = repeatedName(unitParts); !name.isEmpty()) {
+        return twice.arg(QStringLiteral("--units"), name);
     }
     const QStringList parts = partsOf(columns);
     for (const QString &part : parts) {
@@ -77,6 +96,10 @@ std::optional<QString> DataOptions::usageError() const
                          "expected")
                 .arg(part);
         }
+    }
+    const bool areChosen = !parts.isEmpty() && parts.first().contains(u'=');
+    if (const QString name = areChosen ? repeatedName(parts) : QString(); !name.isEmpty()) {
+        return twice.arg(QStringLiteral("--columns"), name);
     }
     return std::nullopt;
 }

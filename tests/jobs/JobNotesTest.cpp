@@ -100,11 +100,11 @@ TEST(JobNotes, SayWhichFieldsHaveNoVariable)
     };
     constexpr Row rows[] = {
         {"Nortihng",
-         "job.json:1:#: note: the field \"Nortihng\" of the table \"Points\" is not a variable of the dictionary "
+         "t.xml:1:#: note: the field \"Nortihng\" of the table \"Points\" is not a variable of the dictionary "
          "\"Survey\": did you mean \"Northing\"?",
          "misspelt: it would show 0 in every row"},
         {"Gradient",
-         "job.json:1:#: note: the field \"Gradient\" of the table \"Points\" is not a variable of the dictionary "
+         "t.xml:1:#: note: the field \"Gradient\" of the table \"Points\" is not a variable of the dictionary "
          "\"Survey\"",
          "nothing near"},
         {"FILLER", "", "blanks are what is wanted"},
@@ -122,7 +122,11 @@ TEST(JobNotes, SayWhichFieldsHaveNoVariable)
         job.run(templateJob(R"("p": {"csv": "good.csv"})", tableStep));
         EXPECT_FALSE(job.error) << row.reason << ": " << job.text().toStdString();
         QString notes = QString::fromStdString(notesOf(job));
-        notes.replace(QRegularExpression(QStringLiteral("job\\.json:1:\\d+")), QStringLiteral("job.json:1:#"));
+        if (*row.expected != 0) {
+            const qsizetype place = content.indexOf("<VariableName>" + QByteArray(row.field)) + 1;
+            EXPECT_TRUE(notes.startsWith(QStringLiteral("t.xml:1:%1: ").arg(place))) << notes.toStdString();
+        }
+        notes.replace(QRegularExpression(QStringLiteral("t\\.xml:1:\\d+")), QStringLiteral("t.xml:1:#"));
         EXPECT_EQ(notes.toStdString(), row.expected) << row.reason;
         job.run(R"("strict": true, )" + templateJob(R"("p": {"csv": "good.csv"})", tableStep));
         EXPECT_EQ(job.error.has_value(), *row.expected != 0) << row.reason << ": an error of a strict job";
@@ -156,6 +160,10 @@ TEST(JobNotes, SayWhichValuesDoNotShowAsTheyAre)
          "line 4 of the report",
          "1    |", "a missing text shows as none and is no reason"},
         {"Number,Northing\n1,\n", R"("options": {"zeroBlank": true}, )", "", "", "blanks are no elevation"},
+        {"Number,Northing\n1,2\n2,NAN\n3,-INF\n", "",
+         "2 values of the field \"Northing\" of the table \"Points\" are infinite or not a number, the first one in row "
+         "2, line 5 of the report",
+         "2    |", "no elevation either"},
     };
     for (const Row &row : rows) {
         TestJob job;
@@ -175,6 +183,138 @@ TEST(JobNotes, SayWhichValuesDoNotShowAsTheyAre)
                 << job.text().toStdString();
         }
     }
+}
+
+TEST(JobNotes, CompareVariablesAndNotTheirIdentifiers)
+{
+    using namespace markup;
+    const QByteArray table =
+        output("Table", "Points", "D", {field("Code", "Code", "5"), field("Elevation", "H", "9.3")});
+    const QByteArray dictionary = element(
+        "Dictionary",
+        element("DictionaryName", "D") +
+            element("VariableList", joined({variable(3, "Code", "TEXT"), variable(3, "Elevation", "ELEVATION")})));
+    TestJob job;
+    job.folder.put("t.xml",
+                   element("ReportTemplate", element("Name", "T") + element("Title", "t") + element("Tables", table) +
+                                                 element("Dictionaries", dictionary) +
+                                                 element("Options", separatorOption("124"))));
+    job.folder.put("p.csv", "Code\nx\n");
+    job.run(templateJob(R"("p": {"csv": "p.csv"})", tableStep));
+    EXPECT_FALSE(job.error) << job.text().toStdString();
+    QString notes = QString::fromStdString(notesOf(job));
+    notes.remove(QRegularExpression(QStringLiteral("job\\.json:1:\\d+: note: ")));
+    EXPECT_EQ(notes.toStdString(),
+              "no column fills the field \"Elevation\" of the table \"Points\"; \"Code\" has the same "
+              "ID and shows there");
+    job.folder.put("p.csv", "Code,Elevation\nx,\n,5\n");
+    job.run(templateJob(R"("p": {"csv": "p.csv"})", tableStep));
+    EXPECT_EQ(notesOf(job), "") << "both are filled";
+}
+
+TEST(JobNotes, SayWhichSortKeysAreNoVariables)
+{
+    using namespace markup;
+    struct Row
+    {
+        const char *key;
+        const char *expected;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {"NUMBER", "", "names count without their case"},
+        {"Nubmer",
+         "the sort key \"Nubmer\" of the table \"Points\" is not a variable of the dictionary \"Survey\": did you mean "
+         "\"Number\"?",
+         "misspelt"},
+        {"Gradient", "the sort key \"Gradient\" of the table \"Points\" is not a variable of the dictionary \"Survey\"",
+         "nothing near"},
+    };
+    for (const Row &row : rows) {
+        const QByteArray content = surveyTemplate(
+            output("Table", "Points", "Survey", {field("Number", "Pt", "5"), field("Northing", "North", "9.3")},
+                   {"Northing", row.key}),
+            "", separatorOption("124"));
+        TestJob job;
+        job.folder.put("t.xml", content);
+        job.folder.put("p.csv", "Number,Northing\n2,2\n1,2\n3,1\n");
+        job.run(templateJob(R"("p": {"csv": "p.csv"})", tableStep));
+        EXPECT_FALSE(job.error) << row.reason << ": " << job.text().toStdString();
+        const QString place =
+            QStringLiteral("t.xml:1:%1: note: ").arg(content.indexOf("<VariableName>" + QByteArray(row.key)) + 1);
+        EXPECT_EQ(notesOf(job), *row.expected != 0 ? place.toStdString() + row.expected : "") << row.reason;
+        if (*row.expected != 0) {
+            EXPECT_EQ(job.notes.said().front().kind, kareport::JobNote::Kind::UnknownSortKey);
+            EXPECT_TRUE(job.text().contains(QStringLiteral("3    |    1.000"))) << job.text().toStdString();
+            EXPECT_LT(job.text().indexOf(QStringLiteral("\n2    |")), job.text().indexOf(QStringLiteral("\n1    |")))
+                << "the key before it counts, as ever";
+        }
+        job.run(R"("strict": true, )" + templateJob(R"("p": {"csv": "p.csv"})", tableStep));
+        EXPECT_EQ(job.error.has_value(), *row.expected != 0) << row.reason << ": an error of a strict job";
+    }
+}
+
+TEST(JobNotes, SayWhatABlockDoesNotShow)
+{
+    struct Row
+    {
+        const char *values;
+        const char *options;
+        const char *expected;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {R"({"Number": "1", "Northing": 2})", "", "", "all shows"},
+        {R"({"Number": "123456", "Northing": 2})", "", "", "a block has no columns that a wide value would move"},
+        {R"({"Number": "123456", "Northing": 2})", R"("options": {"printHash": true}, )",
+         "1 values are wider than the field \"Number\" of the block \"Point\" and show as #, the first one in row 1, line "
+         "2 of the report",
+         "nothing of it shows"},
+        {R"({"Number": "1", "Northing": "INF"})", "",
+         "1 values of the field \"Northing\" of the block \"Point\" are infinite or not a number, the first one in row 1, "
+         "line 3 of the report",
+         "no elevation"},
+    };
+    for (const Row &row : rows) {
+        TestJob job;
+        job.run(templateJob(QByteArray(R"("p": {"values": )") + row.values + "}",
+                            R"({"line": "x"}, {"block": "Point", "data": "p"})", row.options));
+        EXPECT_FALSE(job.error) << row.reason << ": " << job.text().toStdString();
+        QString notes = QString::fromStdString(notesOf(job));
+        notes.remove(QRegularExpression(QStringLiteral("job\\.json:1:\\d+: note: ")));
+        EXPECT_EQ(notes.toStdString(), row.expected) << row.reason << "\n" << job.text().toStdString();
+    }
+}
+
+TEST(JobNotes, NumbersThatShowAsBlanksAreInTheirFileAlone)
+{
+    TestJob job;
+    job.folder.put("p.csv", "Number,Northing\n1,2\n2,\n3,\n");
+    job.run(templateJob(R"("p": {"csv": "p.csv", "units": {"length": "m"}})", tableStep,
+                        R"("strict": true, "options": {"zeroBlank": true}, )"));
+    EXPECT_FALSE(job.error) << job.text().toStdString();
+    EXPECT_EQ(notesOf(job), "") << "blanks were asked for";
+    ASSERT_EQ(job.notes.all().size(), 1U);
+    const kareport::JobNote &note = job.notes.all().front();
+    EXPECT_EQ(note.kind, kareport::JobNote::Kind::BlankValue);
+    EXPECT_EQ(note.values, 2U);
+    EXPECT_EQ(note.firstRow, 2U);
+}
+
+TEST(JobNotes, AreBounded)
+{
+    TestJob job;
+    QByteArray header = "Number,Northing";
+    for (int i = 0; i < 150'000; ++i) {
+        header += ",x" + QByteArray::number(i, 36);
+    }
+    job.folder.put("p.csv", header + "\n");
+    job.run(templateJob(R"("p": {"csv": "p.csv"})", tableStep));
+    EXPECT_FALSE(job.error) << job.text().toStdString();
+    ASSERT_EQ(job.notes.said().size(), 101U);
+    EXPECT_EQ(job.notes.said().back().about.text.toStdString(),
+              "149900 more columns are not variables of the dictionary \"Survey\"");
+    EXPECT_EQ(job.notes.said()[99].about.place->column, header.indexOf(",x2r,") + 2) << "places are those of the names";
 }
 
 TEST(JobNotes, AreErrorsInAStrictJob)

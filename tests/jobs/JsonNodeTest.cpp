@@ -259,7 +259,7 @@ TEST(JsonSource, AKeyThatStandsTwiceIsAnErrorWithBothPlaces)
         JsonSource::fromBytes(job, "{\"report\": [],\n \"data\": {\"d\": {\"values\": {\"A\": 1,\n  \"A\": 2}}}}");
     const InputError *error = errorOf(read);
     ASSERT_NE(error, nullptr);
-    EXPECT_EQ(error->message(), QStringLiteral("job.json:3:3: error: the key \"A\" stands in line 2 already: each key "
+    EXPECT_EQ(error->message(), QStringLiteral("job.json:3:3: error: the key \"A\" is in line 2 already: each key "
                                                "was expected once"));
 }
 
@@ -295,7 +295,7 @@ TEST(JsonSource, WhatCannotBeSetIsSaidInASentence)
          "each step is a call: the stack would not hold them"},
         {QStringLiteral("title"), QStringLiteral("[").repeated(50000), QString(), "no JSON: a text"},
         {QStringLiteral("data"), QStringLiteral("{\"d\": {\"csv\": \"a\", \"csv\": \"b\"}}"),
-         QStringLiteral("the key \"csv\" stands twice in \"{\"d\": {\"csv\": \"a\", \"csv\": \"b\"}}\""),
+         QStringLiteral("the key \"csv\" occurs twice in \"{\"d\": {\"csv\": \"a\", \"csv\": \"b\"}}\""),
          "a key twice in a value"},
     };
     for (const Row &row : rows) {

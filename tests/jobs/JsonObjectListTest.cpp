@@ -84,6 +84,8 @@ TEST(JsonObjectList, StoresMembersByTheTypeOfTheVariable)
         {VARIABLE_NUMBER, R"({"V": "BM-3"})", "32 BM-3", "a point's number"},
         {VARIABLE_NUMBER, R"({"V": 12})", "32 12", "a point's number without quotes"},
         {VARIABLE_NUMBER, R"({"V": 100000})", "32 100000", "no exponent"},
+        {VARIABLE_NUMBER, R"({"V": 9007199254740993})", "32 9007199254740993", "with all its digits"},
+        {VARIABLE_TEXT, R"({"V": -9223372036854775807})", "16 -9223372036854775807", "with all its digits"},
         {VARIABLE_BOOLEAN, R"({"V": true})", "1 1", "true"},
         {VARIABLE_BOOLEAN, R"({"V": false})", "1 0", "false"},
         {VARIABLE_BOOLEAN, R"({"V": "Yes"})", "1 1", "a word"},

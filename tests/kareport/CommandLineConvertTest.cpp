@@ -79,7 +79,7 @@ TEST(CommandLineConvert, WrongInputIsSaidWithItsPlace)
         const char *reason;
     };
     const Row rows[] = {
-        {"ok\nb\xE9y\n", "in.rep:2:2: error: a report file was expected; this is no UTF-8\n", "Latin-1"},
+        {"ok\nb\xE9y\n", "in.rep:2:2: error: a report file was expected; this is not UTF-8\n", "Latin-1"},
         {"%PDF-1.3 \xFF", "in.rep:1:1: error: a saved report was expected; this is a PDF\n", "a PDF"},
     };
     for (const Row &row : rows) {
@@ -109,7 +109,7 @@ TEST(CommandLineConvert, AWrongCommandLineIsSaid)
         const char *message;
     };
     const Row rows[] = {
-        {"convert a.rep b.dat", "the ending of \"b.dat\" says no kind"},
+        {"convert a.rep b.dat", "the ending of \"b.dat\" does not say the kind"},
         {"convert a.rep b.dat --as tiff", "--as: one of rep, text, rtf, pdf, rtf-image was expected"},
         {"convert a.rep b.pdf --set title=x", "a key of the page was expected"},
         {"convert a.rep b.pdf --set page.linesPerPage=0", "linesPerPage"},

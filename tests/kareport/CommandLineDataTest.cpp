@@ -72,6 +72,10 @@ TEST(CommandLineData, WhatIsWrongWithAnOptionNamesIt)
         {"-d points.csv --units yard", 1, "--units \"yard\"", "no quantity"},
         {"-d points.csv --columns Number=1,Northing", 1, "--columns \"Northing\"", "names and numbers mixed"},
         {"-d points.csv --columns Nr=1", 2, "--columns Nr=1: error: ", "no such variable"},
+        {"-d points.csv --columns Number=1,Northing=2,Number=2", 1, "--columns: \"Number\" was given twice",
+         "a repeat"},
+        {"-d points.csv --columns Number=1 --columns number=2", 1, "--columns: \"number\" was given twice", "the same"},
+        {"-d points.csv --units length=m,length=ft", 1, "--units: \"length\" was given twice", "two units"},
         {"-d points.csv --skip=-1", 2, "--skip -1: error: ", "below 0"},
         {"--decimal ,", 1, "--data", "no data"},
     };
@@ -144,6 +148,18 @@ TEST(CommandLineData, NotesAreSaidAndWritten)
         EXPECT_EQ(folder.bytesOf("a.txt"), text) << "nothing is written";
     }
     EXPECT_EQ(folder.bytesOf("strict.json"), folder.bytesOf("notes.json"));
+    // What is no mistake ends no strict job, and is no error in it.
+    folder.put("road.xml", R"(<?xml version="1.0"?>
+<LandXML xmlns="http://www.landxml.org/schema/LandXML-1.2" version="1.2">
+<Units><Metric linearUnit="meter" areaUnit="squareMeter" volumeUnit="cubicMeter" temperatureUnit="celsius" pressureUnit="HPA"/></Units>
+<CgPoints><CgPoint name="1">1 2 3</CgPoint></CgPoints><Monuments><Monument name="a"/></Monuments></LandXML>)");
+    folder.put("road-t.xml", controlTemplates().replace("Number", "Name"));
+    folder.put("road.json", R"({"template": {"file": "road-t.xml", "name": "CONTROL"},
+        "data": {"p": {"landxml": "road.xml", "list": "points"}}, "report": [{"table": "Points", "data": "p"}]})");
+    const ProgramRun road = folder.run("render road.json --strict -o road.txt");
+    EXPECT_EQ(road.status, 0) << road.all().constData();
+    EXPECT_TRUE(road.err.contains("note: ")) << road.all().constData();
+    EXPECT_FALSE(road.err.contains("error")) << road.all().constData();
     const ProgramRun toOutput = folder.run("render job.json --strict");
     EXPECT_EQ(toOutput.status, 2);
     EXPECT_EQ(toOutput.out, "") << "nothing of a strict job is printed";

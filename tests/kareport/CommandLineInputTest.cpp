@@ -43,7 +43,7 @@ const Row rows[] = {
     {"job.json", with("\"table\": \"Points\"", "\"table\": \"Pts\""), "job.json:4:38: error: ", "Points",
      "a table that the template does not have"},
     {"job.json", with("\"report\"", "\"header\": true, \"report\""),
-     "job.json:4:2: error: ", "the key \"header\" stands in line 1 already", "a key twice"},
+     "job.json:4:2: error: ", "the key \"header\" is in line 1 already", "a key twice"},
     {"job.json", with("points.csv", "points.csv\\u0000.gz"), "job.json:3:24: error: ", "without a character 0",
      "a file name that the system would cut"},
     {"job.json", with("\"report\"", "\"title\": " + QByteArray(100000, '[') + ", \"report\""),

@@ -1,6 +1,9 @@
 #include "CommandLine.h"
+#include "GeoPackageFile.h"
 
 #include <sys/resource.h>
+#include <sys/wait.h>
+#include <unistd.h>
 
 #include <gtest/gtest.h>
 
@@ -81,6 +84,80 @@ TEST(CommandLineMemory, WhereverItEndsTheProgramSaysSo)
             EXPECT_EQ(folder.bytesOf("out.rep") == "kept", run.status != 0) << row.reason << megabytes;
         }
         EXPECT_GT(refused, 0) << row.reason;
+    }
+}
+
+/// The peak of the program's memory for a job in a folder, in kilobytes; -1 when it fails.
+long peakOf(const QString &folder, const char *job)
+{
+    const QByteArray program = KAREPORT_PROGRAM;
+    const QByteArray path = folder.toUtf8();
+    const pid_t child = fork();
+    if (child == 0) {
+        if (chdir(path.constData()) == 0) {
+            execl(program.constData(), program.constData(), "render", job, "-o", "out.rep", "--quiet", nullptr);
+        }
+        _exit(127);
+    }
+    int status = 0;
+    rusage usage = {};
+    return wait4(child, &status, 0, &usage) == child && status == 0 ? usage.ru_maxrss : -1;
+}
+
+TEST(CommandLineMemory, DoesNotGrowWithTheRows)
+{
+#if defined(__SANITIZE_ADDRESS__)
+    GTEST_SKIP() << "the address sanitizer keeps what was freed";
+#endif
+    struct Row
+    {
+        const char *set;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {R"("csv": "points.csv")", "a file that is mapped"},
+        {R"("csv": "points.csv", "encoding": "windows-1252")", "a file that is converted"},
+        {R"("json": "points.json")", "JSON lines"},
+        {R"("sqlite": "points.db", "table": "points")", "a database"},
+    };
+    const CommandLineFolder folder;
+    const auto putData = [&folder](int count) {
+        QByteArray csv = "Number,Northing\n";
+        QByteArray json;
+        for (int i = 0; i < count; ++i) {
+            const QByteArray number = QByteArray::number(1'000'000'000 + i);
+            csv += number + ",12345.678000000000000000000000000000\n";
+            json += "{\"Number\":\"" + number + "\",\"Northing\":12345.678000000000000000}\n";
+        }
+        folder.put("points.csv", csv);
+        folder.put("points.json", json);
+        QFile::remove(folder.path("points.db"));
+        geo::runSql(
+            folder.path("points.db"),
+            "CREATE TABLE points (Number TEXT, Northing REAL, rest TEXT); WITH RECURSIVE i(n) AS (SELECT 1 UNION ALL "
+            "SELECT n + 1 FROM i WHERE n < " +
+                QByteArray::number(count) +
+                ") INSERT INTO points SELECT 1000000000 + n, n / 10.0, 'something that nobody reads' FROM i");
+    };
+    const auto peaks = [&](int count) {
+        putData(count);
+        std::vector<long> found;
+        for (const Row &row : rows) {
+            folder.put("job.json", QByteArray(R"({"page": {"linesPerPage": 72, "charsPerRow": 80},
+                "template": {"file": "t.xml", "name": "CONTROL"}, "report": [{"table": "Points", "data": "p"}],
+                "data": {"p": {)") + row.set +
+                                       "}}}");
+            found.push_back(peakOf(folder.path(), "job.json"));
+        }
+        return found;
+    };
+    const std::vector<long> few = peaks(40'000);
+    const std::vector<long> many = peaks(400'000); // files of 19 MB
+    constexpr long mostKilobytes = 9 * 1024; // the piece that memory is given back in, and what it is read ahead by
+    for (std::size_t i = 0; i < std::size(rows); ++i) {
+        ASSERT_GT(few[i], 0) << rows[i].reason;
+        ASSERT_GT(many[i], 0) << rows[i].reason;
+        EXPECT_LT(many[i] - few[i], mostKilobytes) << rows[i].reason << ": " << few[i] << " and " << many[i];
     }
 }
 
