@@ -59,6 +59,8 @@ packages_compare=(
     python3-matplotlib      # its pictures
     mawk gawk sqlite3 miller # rows to text
     xsltproc                # points of a LandXML file to text
+    postgresql              # rows from a database server
+    valgrind                # instructions counted
     python3-reportlab enscript ghostscript # pages to PDF
     libreoffice-writer-nogui # pages to PDF, rich text
     pandoc unrtf            # rich text
