@@ -62,6 +62,7 @@ std::optional<InputError> JobRunner::run(UReportDoc &report, ReportTextWriter *s
         return error;
     }
     report.StreamText(stream);
+    const auto kept = qScopeGuard([&report] { report.StreamText(nullptr); });
     const std::function<bool()> isStopped = [this, stream] {
         return isInterrupted() || (stream != nullptr && stream->hasFailed()) || (isToStop_ && isToStop_());
     };

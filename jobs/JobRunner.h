@@ -41,7 +41,8 @@ public:
     /// @param report  a new one, which must stay open. In a program whose preferences must not matter it is made with
     ///                `surroundingsOf` the job
     /// @param stream  receives the text while it is written, where no step takes text back; null keeps it in the report.
-    ///                Once it has failed, no more is made
+    ///                Once it has failed, no more is made. What the report still holds of it at the end is handed on by
+    ///                `UReportDoc::EndTextStream`
     /// @return what is wrong with the job's template or data; nothing when the report has been made or the work was stopped
     /// @throws std::bad_alloc when memory runs out: half a report counts as none
     std::optional<InputError> run(UReportDoc &report, ReportTextWriter *stream = nullptr);

@@ -224,7 +224,6 @@ std::optional<ExitStatus> CommandLineJob::runIntoOutput(JobRunner &runner, URepo
         ReportTextWriter writer(device, isReport ? LineEnds::ReportFile : LineEnds::PlainText);
         inputError = make(runner, report, &writer);
         if (inputError || isInterrupted()) {
-            report.StreamText(nullptr);
             return false;
         }
         isMade = true;
