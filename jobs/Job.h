@@ -1,5 +1,6 @@
 #pragma once
 
+#include "ApplicationTitle.h"
 #include "DataUnits.h"
 #include "DefaultPrinter.h"
 #include "JsonPlaces.h"
@@ -106,7 +107,7 @@ struct Job
 
     std::optional<QString> title;
     bool strict = false; ///< a note on the report is an error
-    QString application = QStringLiteral("TALVEN");
+    QString application = baseApplicationTitle;
     bool header = true;
     std::optional<QDateTime> now;
     Page page;

@@ -5,7 +5,9 @@
 
 #include <QJsonArray>
 
+#include <algorithm>
 #include <array>
+#include <iterator>
 
 namespace kareport
 {
@@ -13,18 +15,24 @@ namespace kareport
 namespace
 {
 
-// The words of settings, in the order of the values that they mean.
-constexpr std::array<QStringView, 3> stationFormats = {u"plain", u"0+00", u"0+000"};
-constexpr std::array<QStringView, 2> northEastOrders = {u"EN", u"NE"};
-constexpr std::array<QStringView, 3> bearingUnits = {u"dms", u"deg", u"gon"};
-constexpr std::array<QStringView, 2> bearingStyles = {u"circle", u"quadrant"};
-constexpr std::array<QStringView, 2> bearingReferences = {u"north", u"south"};
+/// A word of a setting and the value that it means.
+template <typename Value>
+struct Word
+{
+    QStringView word;
+    Value value;
+};
 
-static_assert(static_cast<std::size_t>(UJobSettings::StationFormat::ThousandsPlus) + 1 == stationFormats.size() &&
-                  static_cast<int>(UJobSettings::StationFormat::Plain) == 0 &&
-                  static_cast<int>(UJobSettings::StationFormat::HundredsPlus) == 1,
-              "a word for each station format, in their order");
-static_assert(ORDER_EASTING_NORTHING == 0 && ORDER_NORTHING_EASTING == 1);
+using StationFormat = UJobSettings::StationFormat;
+
+// In the order in which a message lists them.
+constexpr Word<StationFormat> stationFormats[] = {
+    {u"plain", StationFormat::Plain}, {u"0+00", StationFormat::HundredsPlus}, {u"0+000", StationFormat::ThousandsPlus}};
+constexpr Word<int> northEastOrders[] = {{u"NE", ORDER_NORTHING_EASTING}, {u"EN", ORDER_EASTING_NORTHING}};
+// The numbers of a bearing are those that `UFormatBearing` takes.
+constexpr Word<int> bearingUnits[] = {{u"dms", 0}, {u"deg", 1}, {u"gon", 2}};
+constexpr Word<int> bearingStyles[] = {{u"quadrant", 1}, {u"circle", 0}};
+constexpr Word<int> bearingReferences[] = {{u"north", 0}, {u"south", 1}};
 
 constexpr int mostDecimals = 15;
 constexpr int mostBearingDecimals = 9;
@@ -43,18 +51,25 @@ void choose(const JsonNode &node, Find find, const char *expected, Value &value)
     }
 }
 
-/// Finds a word's place in a list.
-template <std::size_t count>
-auto placeIn(const std::array<QStringView, count> &words)
+/// The same with one of a list of words.
+template <typename Entry, std::size_t count, typename Value>
+void choose(const JsonNode &node, const Word<Entry> (&words)[count], Value &value)
 {
-    return [&words](const QString &text) -> std::optional<int> {
-        for (std::size_t i = 0; i < count; ++i) {
-            if (words[i] == text) {
-                return static_cast<int>(i);
-            }
-        }
-        return std::nullopt;
-    };
+    if (!node.exists()) {
+        return;
+    }
+    const QString text = node.text();
+    const auto *found =
+        std::find_if(std::begin(words), std::end(words), [&text](const Word<Entry> &one) { return one.word == text; });
+    if (found != std::end(words)) {
+        value = static_cast<Value>(found->value);
+        return;
+    }
+    QStringList expected;
+    for (const Word<Entry> &one : words) {
+        expected.append(one.word.toString());
+    }
+    node.fail(Xlate("one of %1 was expected").arg(expected.join(QStringLiteral(", "))));
 }
 
 constexpr const char *lengthKeys = "m, mm, km, ft, usft";
@@ -79,11 +94,13 @@ void readAngleMarks(const JsonNode &node, std::array<char, 3> &marks)
     }
 }
 
-/// The word of a value.
-template <typename Words, typename Value>
-QString wordOf(const Words &words, Value value)
+/// The word of a value; that of the first one for a value that has none.
+template <typename Entry, std::size_t count, typename Value>
+QString wordOf(const Word<Entry> (&words)[count], Value value)
 {
-    return words[static_cast<std::size_t>(value)].toString();
+    const auto *found = std::find_if(std::begin(words), std::end(words),
+                                     [value](const Word<Entry> &one) { return static_cast<Value>(one.value) == value; });
+    return (found != std::end(words) ? found : words)->word.toString();
 }
 
 } // namespace
@@ -102,13 +119,13 @@ UJobSettings readSettings(const JsonNode &node, UJobSettings settings)
     settings.lengthDecimals = node["lengthDecimals"].whole(settings.lengthDecimals, 0, mostDecimals);
     settings.stationDecimals = node["stationDecimals"].whole(settings.stationDecimals, 0, mostDecimals);
     settings.numberDecimals = node["numberDecimals"].whole(settings.numberDecimals, 0, mostDecimals);
-    choose(node["stationFormat"], placeIn(stationFormats), "plain, 0+00, 0+000", settings.stationFormat);
-    choose(node["northEastOrder"], placeIn(northEastOrders), "NE, EN", settings.northEastOrder);
-    choose(node["bearingUnit"], placeIn(bearingUnits), "dms, deg, gon", settings.bearingUnit);
-    choose(node["bearingStyle"], placeIn(bearingStyles), "quadrant, circle", settings.bearingStyle);
+    choose(node["stationFormat"], stationFormats, settings.stationFormat);
+    choose(node["northEastOrder"], northEastOrders, settings.northEastOrder);
+    choose(node["bearingUnit"], bearingUnits, settings.bearingUnit);
+    choose(node["bearingStyle"], bearingStyles, settings.bearingStyle);
     settings.bearingDecimals = node["bearingDecimals"].whole(settings.bearingDecimals, 0, mostBearingDecimals);
     settings.bearingPadding = node["bearingPadding"].boolean(settings.bearingPadding != 0) ? 1 : 0;
-    choose(node["bearingReference"], placeIn(bearingReferences), "north, south", settings.bearingReference);
+    choose(node["bearingReference"], bearingReferences, settings.bearingReference);
     readAngleMarks(node["angleMarks"], settings.angleMarks);
     return settings;
 }

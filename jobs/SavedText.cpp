@@ -2,6 +2,7 @@
 
 #include "LineEndings.h"
 #include "PageHeader.h"
+#include "ReportSaveName.h"
 #include "ReportTextDecoder.h"
 #include "RichTextReader.h"
 #include "UReportDoc.h"
@@ -50,11 +51,6 @@ Expected<SavedText> readRich(const QString &path, QByteArrayView bytes)
 }
 
 } // namespace
-
-bool isPdfName(const QString &path)
-{
-    return path.endsWith(u".pdf", Qt::CaseInsensitive);
-}
 
 bool isPdfFile(const QString &path)
 {

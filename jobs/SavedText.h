@@ -14,8 +14,6 @@ class UReportDoc;
 namespace kareport
 {
 
-/// Whether a name is that of a PDF.
-bool isPdfName(const QString &path);
 /// Whether a file is a PDF, by its name or by its first bytes. Anything but a file is not opened.
 bool isPdfFile(const QString &path);
 

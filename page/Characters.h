@@ -20,7 +20,7 @@ constexpr bool isControl(char16_t character)
 
 /// Whether a character needs no shaping: it takes its place in a line whatever is next to it, as it is not joined, not
 /// stacked, not turned round and no half of a pair. The widths of such characters add up.
-constexpr bool standsAlone(char16_t character)
+constexpr bool needsNoShaping(char16_t character)
 {
     struct Range
     {

@@ -5,7 +5,6 @@ namespace kareport
 
 const QStringList &standInFaces()
 {
-    // The PDF's message about a missing font names them as well.
     static const QStringList faces = {QStringLiteral("DejaVu Sans Mono"), QStringLiteral("Liberation Mono"),
                                       QStringLiteral("Hack")};
     return faces;

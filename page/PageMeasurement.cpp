@@ -2,6 +2,7 @@
 
 #include "DefaultPrinter.h"
 #include "FixedPitchFont.h"
+#include "PageUnits.h"
 
 #include <QFont>
 #include <QFontMetricsF>
@@ -20,10 +21,6 @@ namespace kareport
 
 namespace
 {
-
-constexpr int hundredthsPerInch = 2540; // of a millimetre
-constexpr qreal millimetresPerInch = 25.4;
-constexpr int pointsPerInch = 72;
 
 int clampToInt(qint64 value)
 {

@@ -1,6 +1,7 @@
 #include "LinePager.h"
 
 #include "PageRows.h"
+#include "PageUnits.h"
 #include "PrintGeometry.h"
 
 #include <QPaintDevice>
@@ -20,7 +21,6 @@ namespace
 /// What the conversions of a sheet and its margins may take from a length: two margins rounded twice, the sheet cut off.
 constexpr qreal lostTwips = 2;
 constexpr qreal lostDots = 1;
-constexpr qreal pointsPerInch = 72;
 
 qreal dotsOf(int twips, int resolution)
 {

@@ -2,6 +2,7 @@
 
 #include "FixedPitchFont.h"
 #include "PageMeasurement.h"
+#include "PageUnits.h"
 #include "PrintGeometry.h"
 
 #include <QFontMetricsF>
@@ -17,7 +18,6 @@ namespace
 {
 
 constexpr int fontPoints = 10;
-constexpr int pointsPerInch = 72;
 constexpr int farEnd = 10'000; // beyond every sheet
 
 /// A fixed-pitch font whose lines are `height` dots high.

@@ -2,7 +2,7 @@
 
 #include "Characters.h"
 #include "FixedPitchFont.h"
-#include "PageMeasurement.h"
+#include "PageUnits.h"
 
 #include <QFontInfo>
 #include <QFontMetricsF>
@@ -21,7 +21,6 @@ namespace kareport
 namespace
 {
 
-constexpr int pointsPerInch = 72;
 constexpr qreal usualScreenResolution = 96;
 
 qreal screenResolution()
@@ -53,7 +52,7 @@ void fillGlyphs(PrintFace &face)
     QString characters;
     for (std::size_t code = 0; code < face.glyphs.size(); ++code) {
         const auto character = static_cast<char16_t>(code);
-        characters += standsAlone(character) ? QChar(character) : QChar(u' ');
+        characters += needsNoShaping(character) ? QChar(character) : QChar(u' ');
     }
     face.raw = QRawFont::fromFont(face.font);
     const QList<quint32> glyphs = face.raw.glyphIndexesForString(characters);

@@ -1,6 +1,7 @@
 #include "PrintGeometry.h"
 
 #include "PageMeasurement.h"
+#include "PageUnits.h"
 
 #include <algorithm>
 #include <climits>
@@ -12,8 +13,6 @@ namespace kareport
 namespace
 {
 
-constexpr int hundredthsPerInch = 2540;
-constexpr qreal millimetresPerInch = 25.4;
 constexpr int leastRoom = 567; // twips: 10 mm
 
 int twipsOfDots(int dots, unsigned resolution)

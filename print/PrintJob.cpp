@@ -57,7 +57,7 @@ private:
 
     bool isWanted(int page) const { return ranges_.isEmpty() || ranges_.contains(page); }
     /// Whether a page lies after those that are asked for. Says so where it is one that the limit leaves out.
-    bool isBehindLast(int page)
+    bool isAfterLast(int page)
     {
         if (!ranges_.isEmpty() && page > ranges_.lastPage()) {
             return true;
@@ -69,7 +69,7 @@ private:
 
     void runForwards()
     {
-        for (int page = 1; !isBehindLast(page) && goesOn(page) && source_.find(painter_, page); ++page) {
+        for (int page = 1; !isAfterLast(page) && goesOn(page) && source_.find(painter_, page); ++page) {
             if (isWanted(page) && !(print(page) && hasMore_)) {
                 return;
             }
@@ -79,7 +79,7 @@ private:
     void runBackwards()
     {
         int last = 0;
-        while (!isBehindLast(last + 1) && goesOn(last + 1) && source_.find(painter_, last + 1)) {
+        while (!isAfterLast(last + 1) && goesOn(last + 1) && source_.find(painter_, last + 1)) {
             ++last;
         }
         for (int page = last; page > 0 && outcome_.result == PrintResult::Done; --page) {

@@ -15,6 +15,16 @@ bool endsWithExtension(QStringView name, QStringView extension)
     return at >= 0 && at == name.size() - extension.size();
 }
 
+bool isRichTextName(QStringView name)
+{
+    return endsWithExtension(name, u".rtf");
+}
+
+bool isPdfName(QStringView name)
+{
+    return endsWithExtension(name, u".pdf");
+}
+
 std::optional<QString> askReportName(UDocument &document, bool richTextFirst)
 {
     SaveRequest request;

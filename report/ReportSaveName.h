@@ -16,6 +16,9 @@ inline const QString lastReportFolder = QStringLiteral("LastOpenDirectoryReport"
 /// Whether a file name ends with an extension (".rtf", in small letters), in any case. The first occurrence of the
 /// extension decides: a name that holds it earlier as well does not count as ending with it.
 bool endsWithExtension(QStringView name, QStringView extension);
+/// Whether a report is saved as rich text under a name, or as a PDF; otherwise it is saved as report text.
+bool isRichTextName(QStringView name);
+bool isPdfName(QStringView name);
 /// Asks for the name of a file to save a report in, beginning with the folder used last, and keeps its folder.
 /// @param richTextFirst  offers rich text before report text
 /// @return nothing when the user has cancelled

@@ -144,7 +144,7 @@ bool UReportDoc::IsConvertToOpenInWord(const QString &file, const QString &edito
     if (kareport::isExcelEditor(editor)) {
         SetExternalExcel();
     }
-    return !kareport::endsWithExtension(file, u".rtf") && !kareport::endsWithExtension(file, u".pdf");
+    return !kareport::isRichTextName(file) && !kareport::isPdfName(file);
 }
 
 void UReportDoc::UpdateAllViews(UView *sender, long hint, void *hintObject)

@@ -1,6 +1,7 @@
 #include "UReportDoc.h"
 
 #include "AppMessageBox.h"
+#include "ApplicationTitle.h"
 #include "ByteLineReader.h"
 #include "MemoryLasts.h"
 #include "ReportGuards.h"
@@ -17,9 +18,6 @@
 
 namespace
 {
-
-/// The word that the first line of a report begins with.
-constexpr QLatin1StringView firstWord("TALVEN");
 
 /// The most of a file's first line that is looked at to tell what it is.
 constexpr qint64 longestProbe = qint64(64) * 1024;
@@ -58,8 +56,8 @@ bool readLines(QIODevice &file, kareport::PageWriter &page, bool mayBeRichText, 
             line.chop(1);
         }
         // What comes before the first word of a report is the byte-order mark; in rich text it is the head.
-        if (!isRichText && page.lineCount() == 0 && line.indexOf(firstWord) > 0) {
-            line = line.sliced(line.indexOf(firstWord));
+        if (!isRichText && page.lineCount() == 0 && line.indexOf(baseApplicationTitle) > 0) {
+            line = line.sliced(line.indexOf(baseApplicationTitle));
         }
         page.writeLine(line, 0, 1, 0);
         page.countLine();

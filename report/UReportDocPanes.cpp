@@ -16,7 +16,7 @@ using kareport::showsReport;
 namespace
 {
 
-/// Whether a pane has the title as its caption. An empty title is no pane's caption.
+/// Whether a pane has the title as its caption. No pane has an empty caption.
 bool isTaken(const QString &title, const QStringList &captions)
 {
     if (title.isEmpty()) {

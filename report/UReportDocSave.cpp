@@ -21,16 +21,6 @@
 namespace
 {
 
-bool isRichTextName(const QString &name)
-{
-    return kareport::endsWithExtension(name, u".rtf");
-}
-
-bool isPdfName(const QString &name)
-{
-    return kareport::endsWithExtension(name, u".pdf");
-}
-
 /// Saves what the first view shows that can write it. @return whether it did; nothing without such a view
 std::optional<bool> saveViewAsRichText(UReportDoc &report, const QString &path, QString &problem)
 {
@@ -93,12 +83,12 @@ bool saveByName(UReportDoc &report, const QString &path, QString &problem)
         return false;
     }
     kareport::finishLoading(report);
-    if (isRichTextName(path)) {
+    if (kareport::isRichTextName(path)) {
         // Without a view that can write it, the report text is saved under the name.
         const auto saved = saveViewAsRichText(report, path, problem);
         return saved ? *saved : saveText(report, path, problem);
     }
-    return isPdfName(path) ? savePdf(report, path, problem) : saveText(report, path, problem);
+    return kareport::isPdfName(path) ? savePdf(report, path, problem) : saveText(report, path, problem);
 }
 
 /// Saves a report under a name that may be asked for. @param replace  whether the name becomes the report's own
@@ -128,7 +118,7 @@ bool saveUnderChosenName(UReportDoc &report, const QString &path, bool replace)
     }
     if (isThere) {
         if (replace) {
-            report.SetPathName(name, !isRichTextName(name) && !isPdfName(name));
+            report.SetPathName(name, !kareport::isRichTextName(name) && !kareport::isPdfName(name));
         }
         report.SetModifiedFlag(false);
     }

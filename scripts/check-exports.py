@@ -5,7 +5,7 @@ declared there, or a function that is declared and not offered. Prints one line 
     scripts/check-exports.py HEADERS LIBRARY...
 
 HEADERS is the folder of the installed headers. What the compiler makes of the standard library and of Qt in passing is
-nobody's interface and is passed over.
+not part of an interface and is skipped.
 """
 
 import pathlib

@@ -1,6 +1,7 @@
 #include "TextEncoding.h"
 
 #include "SpooledBytes.h"
+#include "Windows1252.h"
 #include "Xlate.h"
 
 #include <QChar>
@@ -15,12 +16,6 @@ namespace kareport
 
 namespace
 {
-
-/// What the bytes from 0x80 to 0x9F are in Windows-1252; 0 is no character.
-constexpr std::array<char16_t, 32> windowsCharacters = {0x20AC, 0,      0x201A, 0x0192, 0x201E, 0x2026, 0x2020, 0x2021,
-                                                        0x02C6, 0x2030, 0x0160, 0x2039, 0x0152, 0,      0x017D, 0,
-                                                        0,      0x2018, 0x2019, 0x201C, 0x201D, 0x2022, 0x2013, 0x2014,
-                                                        0x02DC, 0x2122, 0x0161, 0x203A, 0x0153, 0,      0x017E, 0x0178};
 
 void appendUtf8(std::string &out, char32_t character)
 {
@@ -69,7 +64,7 @@ public:
         if (encoding_ == TextEncoding::Latin1 || byte < 0x80 || byte >= 0xA0) {
             return byte;
         }
-        const char16_t character = windowsCharacters[byte - 0x80U];
+        const char16_t character = windows1252[byte - 0x80U];
         return character != 0 ? std::optional<char32_t>(character) : std::nullopt;
     }
 

@@ -56,7 +56,7 @@ void ScanText::removeRuns(qsizetype from, qsizetype count)
     const auto firstGone = std::lower_bound(runs_.begin(), runs_.end(), from,
                                             [](const Run &run, qsizetype wanted) { return run.at < wanted; });
     if (stop >= size()) {
-        // With nothing left at all, the first run says where the text stood.
+        // With nothing left at all, the first run says where the text was.
         runs_.erase(firstGone == runs_.begin() ? firstGone + 1 : firstGone, runs_.end());
         return;
     }

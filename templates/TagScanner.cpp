@@ -29,7 +29,7 @@ struct Tag
     qsizetype size() const { return name.size() + (closing ? 3 : 2); }
 
     /// Whether the tag begins at a position. Capitals are taken character by character.
-    bool standsAt(QStringView text, qsizetype position) const
+    bool isAt(QStringView text, qsizetype position) const
     {
         if (text.size() - position < size() || text[position] != u'<') {
             return false;
@@ -48,11 +48,11 @@ struct Tag
 
     qsizetype find(QStringView text, qsizetype from) const
     {
-        // Tags stand so close together that walking to the next one is faster than any search for it.
+        // Tags are so close together that walking to the next one is faster than any search for it.
         const char16_t *const begin = text.utf16();
         const char16_t *const end = begin + text.size();
         for (const char16_t *at = std::find(begin + from, end, u'<'); at != end; at = std::find(at + 1, end, u'<')) {
-            if (standsAt(text, at - begin)) {
+            if (isAt(text, at - begin)) {
                 return at - begin;
             }
         }
@@ -98,7 +98,7 @@ ScanElement elementBetween(const ScanText &text, QStringView tag, qsizetype open
 void noteDropped(const ScanText &text, QStringView tag, qsizetype close, ScanNotes *notes)
 {
     const QStringView view = text.view();
-    if (notes == nullptr || !shortClosing.standsAt(view, close)) {
+    if (notes == nullptr || !shortClosing.isAt(view, close)) {
         return;
     }
     const qsizetype stop = close + shortClosing.size();
@@ -201,14 +201,14 @@ std::optional<NodeSequence::Opening> NodeSequence::findOpening()
     const QStringView rest = view_.sliced(position_);
     const QString joint = before.toString().append(rest.first(std::min(reach, rest.size())));
     for (qsizetype i = 0; i < before.size(); ++i) {
-        if (closing(tag_).standsAt(joint, i)) {
+        if (closing(tag_).isAt(joint, i)) {
             const qsizetype open = opening(tag_).find(view_, position_);
             if (open >= 0) {
                 end(ScanNote::Kind::ClosedBeforeOpen, open);
             }
             return std::nullopt;
         }
-        if (opening(tag_).standsAt(joint, i)) {
+        if (opening(tag_).isAt(joint, i)) {
             const qsizetype at = position_ - before.size() + i;
             return Opening{at, at + opening(tag_).size()};
         }

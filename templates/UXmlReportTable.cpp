@@ -50,7 +50,7 @@ int UXmlReportTable::GetFieldsCount() const
 void UXmlReportTable::ReorderingHeading()
 {
     if (!kareport::doneWhileMemoryLasts([this] { CreateHeading(); })) {
-        table_ = nullptr; // a table without its heading, or with one of other columns, is none
+        table_ = nullptr; // a table without its heading, or with one of other columns, is of no use
     }
 }
 

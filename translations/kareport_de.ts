@@ -210,8 +210,8 @@
     </message>
     <message>
         <location filename="../formats/pdf/PdfExport.cpp"/>
-        <source>no fixed-pitch font was found: DejaVu Sans Mono, Liberation Mono or Hack was expected</source>
-        <translation>keine dicktengleiche Schrift wurde gefunden: DejaVu Sans Mono, Liberation Mono oder Hack wurde erwartet</translation>
+        <source>no fixed-pitch font was found: one of %1 was expected</source>
+        <translation>keine dicktengleiche Schrift wurde gefunden: eine von diesen wurde erwartet: %1</translation>
     </message>
     <message>
         <location filename="../formats/pdf/PdfExport.cpp"/>

@@ -210,8 +210,8 @@
     </message>
     <message>
         <location filename="../formats/pdf/PdfExport.cpp"/>
-        <source>no fixed-pitch font was found: DejaVu Sans Mono, Liberation Mono or Hack was expected</source>
-        <translation>等幅フォントが見つかりません: DejaVu Sans Mono、Liberation Mono、Hack のいずれかが必要です</translation>
+        <source>no fixed-pitch font was found: one of %1 was expected</source>
+        <translation>等幅フォントが見つかりません: 次のいずれかが必要です: %1</translation>
     </message>
     <message>
         <location filename="../formats/pdf/PdfExport.cpp"/>

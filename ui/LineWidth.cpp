@@ -84,7 +84,7 @@ int LineWidth::of(QStringView line) const
         const char16_t character = line[i].unicode();
         if (isAscii(character)) {
             ++ascii;
-        } else if (standsAlone(character)) {
+        } else if (needsNoShaping(character)) {
             width += widthOf(character);
         } else {
             isSum = false;

@@ -1,5 +1,6 @@
 #include "ReportEdit.h"
 
+#include "ValueGuard.h"
 #include "Xlate.h"
 
 #include <QScrollBar>
@@ -68,7 +69,7 @@ void ReportEdit::noteEdit(int position, int removed, int added)
     if (isFollowing_ || isLoading() || !edited_) {
         return;
     }
-    // The end of the last paragraph, which is no character of the text, is counted with an edit that touches it.
+    // The end of the last paragraph, which is not a character of the text, is counted with an edit that touches it.
     const int over = std::max(0, position + added - length_);
     change.position = position;
     change.removed = removed - over;
@@ -97,12 +98,11 @@ bool ReportEdit::applyChange(const ReportChange &change)
     if (isLoading() || change.lengthBefore != length_ || change.lineEndsInAll != lineEnds_) {
         return false;
     }
-    isFollowing_ = true;
+    const ValueGuard following(isFollowing_, true, [this](bool on) { isFollowing_ = on; });
     QTextCursor cursor(document());
     cursor.setPosition(change.position);
     cursor.setPosition(change.position + change.removed, QTextCursor::KeepAnchor);
     cursor.insertText(change.inserted);
-    isFollowing_ = false;
     return true;
 }
 

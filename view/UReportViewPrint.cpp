@@ -46,7 +46,7 @@ public:
         return isOpen() && text_ != nullptr && static_cast<UReportView *>(*view_)->GetEdit().document() == text_ &&
                text_->revision() == revision_;
     }
-    /// Whether the view is still there. Its widget is no sign of that: it may outlive the view.
+    /// Whether the view is still there. Its widget does not tell: it may outlive the view.
     bool isOpen() const { return *view_ != nullptr; }
 
 private:

@@ -88,6 +88,7 @@ private:
     void cascade();
     /// Docks all panes one after the other. @param join  joins a pane to the one before it
     void dockAll(const std::function<void(QDockWidget *before, QDockWidget *dock)> &join);
+    void joinDocks(const std::function<void(QDockWidget *before, QDockWidget *dock)> &join);
     void about();
     void loadLayout();
     /// Called when all reports are closed.

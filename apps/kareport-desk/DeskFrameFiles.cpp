@@ -2,8 +2,8 @@
 
 #include "AppMessageBox.h"
 #include "JobLauncher.h"
+#include "ReportSaveName.h"
 #include "SavedReports.h"
-#include "SavedText.h"
 #include "UApplication.h"
 #include "UReportDoc.h"
 #include "UView.h"

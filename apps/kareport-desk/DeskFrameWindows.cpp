@@ -9,6 +9,7 @@
 #include "UReportDoc.h"
 #include "UReportWindowDlg.h"
 #include "UView.h"
+#include "ValueGuard.h"
 
 #include <QApplication>
 #include <QDockWidget>
@@ -114,7 +115,14 @@ void DeskFrame::newWindow()
 
 void DeskFrame::dockAll(const std::function<void(QDockWidget *, QDockWidget *)> &join)
 {
-    layout()->setEnabled(false); // each pane would lay all others out again: once, at the end, is enough
+    joinDocks(join);
+    layout()->activate();
+}
+
+void DeskFrame::joinDocks(const std::function<void(QDockWidget *, QDockWidget *)> &join)
+{
+    // Each pane would lay all others out again: once, at the end, is enough.
+    const kareport::ValueGuard quiet(layout()->isEnabled(), false, [this](bool on) { layout()->setEnabled(on); });
     QDockWidget *before = nullptr;
     for (QDockWidget *dock : findChildren<QDockWidget *>(QString(), Qt::FindDirectChildrenOnly)) {
         const auto *paneDock = dynamic_cast<kareport::PaneDock *>(dock);
@@ -130,8 +138,6 @@ void DeskFrame::dockAll(const std::function<void(QDockWidget *, QDockWidget *)> 
         }
         before = dock;
     }
-    layout()->setEnabled(true);
-    layout()->activate();
 }
 
 void DeskFrame::arrange(Qt::Orientation orientation)

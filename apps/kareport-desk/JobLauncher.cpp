@@ -9,12 +9,12 @@
 #include "Progress.h"
 #include "ReportWindow.h"
 #include "ReportWindowEntry.h"
+#include "ValueGuard.h"
 #include "WorkDialog.h"
 #include "Xlate.h"
 
 #include <QCoreApplication>
 #include <QFileInfo>
-#include <QScopedValueRollback>
 
 #include <algorithm>
 #include <new>
@@ -168,7 +168,7 @@ UReportDoc *launch(const Read &read, QWidget *parent, QString &error, JobNotes &
         error = Xlate("Another job is running. Wait until it has finished, or cancel it.");
         return nullptr;
     }
-    const QScopedValueRollback<bool> running(runningJob(), true);
+    const ValueGuard running(runningJob(), true, [](bool on) { runningJob() = on; });
     setInterrupted(false);
     try {
         return runJob(read(), parent, error, notes);

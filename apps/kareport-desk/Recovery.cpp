@@ -2,7 +2,7 @@
 
 #include "MemoryLasts.h"
 #include "ReportEntry.h"
-#include "SavedText.h"
+#include "ReportSaveName.h"
 #include "UReportDoc.h"
 #include "UReportView.h"
 #include "UReportWindowDlg.h"

@@ -8,7 +8,6 @@
 #include "ReplaceFile.h"
 #include "ReportSaveName.h"
 #include "ReportViews.h"
-#include "SavedText.h"
 #include "UApplication.h"
 #include "UReportDoc.h"
 #include "WaitCursor.h"

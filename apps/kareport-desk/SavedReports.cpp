@@ -27,7 +27,7 @@ namespace
 {
 
 /// The text of a report file as it was before it was saved: each line end once, and UTF-8 as the characters that it encodes
-/// for. Rich text, and what is no UTF-8, is another text, which the report loads byte by byte. A name that rich text has says
+/// for. Rich text, and what is not UTF-8, is another text, which the report loads byte by byte. A name that rich text has says
 /// nothing: without a view that could write that, the report text is saved under it.
 TextFile readReportFile(const QString &path, UserInput input)
 {

@@ -55,7 +55,7 @@ ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, 
         if (result.isReaderGone) {
             progress.finish();
             endByClosedReader();
-            return exitOutput; // whoever has switched the signal off wants no more of it either
+            return exitOutput; // where the signal is switched off, no more of it is wanted either
         }
         progress.finish();
         if (!result.isWritten() && isInterrupted()) {

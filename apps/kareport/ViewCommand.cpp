@@ -54,7 +54,7 @@ ExitStatus ViewCommand::run(int &argc, char **argv) const
         return fail(exitOutput,
                     Xlate("there is no display to show a window on: DISPLAY or WAYLAND_DISPLAY was expected"));
     }
-    // The full path, so that a name that begins with "-" is no option.
+    // The full path, so that a name that begins with "-" is not taken for an option.
     if (!QProcess::startDetached(desk, {shown.absoluteFilePath()})) {
         return fail(exitOutput, Xlate("\"%1\" could not be started").arg(desk));
     }

@@ -60,7 +60,7 @@ class Screen:
         self.display.flush()
 
     def picture(self, path):
-        from PIL import Image  # only where somebody wants to look
+        from PIL import Image  # only needed to look at the pictures
         Image.frombytes("RGB", SIZE, self.pixels((0, 0, *SIZE)), "raw", "BGRX").save(path)
 
 

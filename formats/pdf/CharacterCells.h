@@ -2,8 +2,13 @@
 
 #include <QStringView>
 
+#include <cstddef>
+
 namespace kareport
 {
+
+/// The entries of a table by character, for those that are one unit of a text.
+inline constexpr std::size_t planeSize = 0x10000;
 
 /// The cells that a character takes on a grid of fixed pitch: 2 for one that East Asian typography sets wide or full
 /// width; 0 for a combining mark, for a Hangul vowel or final consonant that joins the syllable before it, and for a

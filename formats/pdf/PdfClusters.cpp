@@ -10,7 +10,6 @@ namespace kareport
 namespace
 {
 
-constexpr std::size_t planeSize = 0x10000;
 /// A glyph that is narrower than its room by no more than this is centred in it: readers interpret a gap of a tenth as
 /// a blank.
 constexpr double slack = 50;
@@ -63,7 +62,7 @@ void PdfClusters::begin(PdfDocument &pdf, std::vector<PdfFont> &fonts, int cell,
     single_.assign(planeSize, -1);
 }
 
-const PdfCluster &PdfClusters::of(QStringView text)
+const PdfCluster &PdfClusters::embed(QStringView text)
 {
     int *place = nullptr;
     if (text.size() == 1) {

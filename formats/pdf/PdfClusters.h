@@ -45,9 +45,9 @@ public:
     /// @param substitute  stands for characters that no face has
     void begin(PdfDocument &pdf, std::vector<PdfFont> &fonts, int cell, char16_t substitute);
 
-    /// The cluster that a piece of text is, which `clusterEnd` has cut. The first time, the faces and glyphs that it needs are
-    /// embedded. The reference holds as long as this object.
-    const PdfCluster &of(QStringView text);
+    /// The cluster that a piece of text is, which `clusterEnd` has cut, with the faces and glyphs that it needs embedded. The
+    /// reference holds as long as this object.
+    const PdfCluster &embed(QStringView text);
     /// The face that could not be embedded.
     const std::optional<PdfFace> &failedFace() const { return failedFace_; }
 

@@ -1,6 +1,7 @@
 #include "PdfExport.h"
 
 #include "CharacterCells.h"
+#include "FixedPitchFont.h"
 #include "LineBreaker.h"
 #include "MemoryLasts.h"
 #include "PdfDocument.h"
@@ -83,7 +84,8 @@ private:
         const auto preferred = preferredPdfFace(options_.fontFolders.value_or(systemFontFolders()));
         const std::vector<PdfFace> faces = orderPdfFaces(preferred, fixedPitchPdfFaces());
         if (faces.empty()) {
-            return fail(Xlate("no fixed-pitch font was found: DejaVu Sans Mono, Liberation Mono or Hack was expected"));
+            return fail(Xlate("no fixed-pitch font was found: one of %1 was expected")
+                            .arg(standInFaces().join(QStringLiteral(", "))));
         }
         return typesetter_.begin(faces, characters) || fail(libraryError());
     }

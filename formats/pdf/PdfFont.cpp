@@ -1,5 +1,7 @@
 #include "PdfFont.h"
 
+#include "CharacterCells.h"
+
 #include <QByteArray>
 
 #include <hpdf_font.h>
@@ -17,7 +19,6 @@ namespace kareport
 namespace
 {
 
-constexpr std::size_t planeSize = 0x10000;
 /// Entries of one block of a text map.
 constexpr std::size_t longestBlock = 100;
 

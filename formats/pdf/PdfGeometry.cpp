@@ -1,6 +1,7 @@
 #include "PdfGeometry.h"
 
 #include "PageFit.h"
+#include "PageUnits.h"
 
 #include <algorithm>
 
@@ -10,8 +11,6 @@ namespace kareport
 namespace
 {
 
-constexpr double pointsPerInch = 72;
-constexpr double hundredthsPerInch = 2540;
 /// The smallest distance and size that the numbers of a PDF can still say.
 constexpr double smallest = 0.01;
 /// The smallest distance of lines, in font heights: closer, and descenders would run into what is below.
@@ -21,15 +20,15 @@ constexpr double rounding = 1e-4;
 
 double marginPoints(int margin)
 {
-    return static_cast<double>(qint64(margin) * 72) / hundredthsPerInch;
+    return static_cast<double>(qint64(margin) * pointsPerInch) / hundredthsPerInch;
 }
 
 } // namespace
 
 PdfPageBox pdfPageBox(const PdfPageSetup &setup)
 {
-    const double width = setup.pageSize.width() * pointsPerInch / setup.resolution;
-    const double height = setup.pageSize.height() * pointsPerInch / setup.resolution;
+    const double width = double(setup.pageSize.width()) * pointsPerInch / setup.resolution;
+    const double height = double(setup.pageSize.height()) * pointsPerInch / setup.resolution;
     PdfPageBox box;
     box.width = static_cast<float>(width);
     box.height = static_cast<float>(height);

@@ -14,7 +14,6 @@ namespace kareport
 namespace
 {
 
-constexpr std::size_t planeSize = 0x10000;
 /// Strings of a PDF end before 65535 bytes; a character takes four at most.
 constexpr qsizetype longestRun = 16000;
 
@@ -82,7 +81,7 @@ void PdfTypesetter::prepare(QStringView line, const std::function<void(char32_t)
     }
     for (qsizetype at = 0; at < line.size();) {
         const qsizetype end = clusterEnd(line, at);
-        for (const char32_t character : clusters_.of(line.sliced(at, end - at)).missing) {
+        for (const char32_t character : clusters_.embed(line.sliced(at, end - at)).missing) {
             isMissing(character);
         }
         at = end;
@@ -178,7 +177,7 @@ qsizetype PdfTypesetter::collectWord(QStringView line, qsizetype begin)
         if (cluster == u" " && !word_.empty()) {
             break;
         }
-        word_.push_back(&clusters_.of(cluster));
+        word_.push_back(&clusters_.embed(cluster));
         at = end;
         if (cluster == u" ") {
             break;

@@ -1,5 +1,7 @@
 #include "RichTextCodePage.h"
 
+#include "Windows1252.h"
+
 #include <QChar>
 
 #include <algorithm>
@@ -12,13 +14,6 @@ namespace
 {
 
 constexpr int westernCodePage = 1252;
-
-/// Bytes 0x80 to 0x9F of code page 1252; the others are Latin-1. It is what nearly every file holds, and it is read alike
-/// where there are no converters.
-constexpr std::array<char16_t, 32> western = {0x20AC, 0x0081, 0x201A, 0x0192, 0x201E, 0x2026, 0x2020, 0x2021,
-                                              0x02C6, 0x2030, 0x0160, 0x2039, 0x0152, 0x008D, 0x017D, 0x008F,
-                                              0x0090, 0x2018, 0x2019, 0x201C, 0x201D, 0x2022, 0x2013, 0x2014,
-                                              0x02DC, 0x2122, 0x0161, 0x203A, 0x0153, 0x009D, 0x017E, 0x0178};
 
 struct NumberRow
 {
@@ -74,7 +69,11 @@ RichTextCodePage::RichTextCodePage(int number)
     for (std::size_t byte = 0; byte < table_.size(); ++byte) {
         table_[byte] = static_cast<char16_t>(byte);
     }
-    std::copy(western.begin(), western.end(), table_.begin() + 0x80);
+    for (std::size_t i = 0; i < windows1252.size(); ++i) {
+        if (windows1252[i] != 0) {
+            table_[0x80 + i] = windows1252[i];
+        }
+    }
     if (number == symbolCodePage) {
         // What the sign of a font is, is known where the font is. Letters stay: many fonts that say to hold signs hold
         // letters.

@@ -111,7 +111,7 @@ void RichTextParser::put(char16_t character)
     case QChar::ParagraphSeparator: endParagraph(); return;
     case 0xFDD0:
     case 0xFDD1:
-        // They are no characters, and a document keeps them for the edges of its frames.
+        // They are not characters, and a document keeps them for the edges of its frames.
         character = QChar::ReplacementCharacter;
         break;
     default: break;

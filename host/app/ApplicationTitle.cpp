@@ -3,11 +3,9 @@
 namespace
 {
 
-const QString baseTitle = QStringLiteral("TALVEN");
-
 QString &currentTitle()
 {
-    static QString title = baseTitle;
+    static QString title = baseApplicationTitle;
     return title;
 }
 
@@ -20,7 +18,7 @@ QString GetApplicationTitle()
 
 bool SetApplicationTitle(const QString &title)
 {
-    if (!title.startsWith(baseTitle)) {
+    if (!title.startsWith(baseApplicationTitle)) {
         return false;
     }
     currentTitle() = title;

@@ -39,8 +39,8 @@ bool readName(int handle)
 
 UnfinishedFile::UnfinishedFile(int handle)
 {
-    int nobody = -1;
-    if (handle >= 0 && owner.compare_exchange_strong(nobody, handle)) {
+    int none = -1;
+    if (handle >= 0 && owner.compare_exchange_strong(none, handle)) {
         handle_ = handle;
         isKnown = readName(handle);
     }

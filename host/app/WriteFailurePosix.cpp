@@ -14,7 +14,7 @@ QString whyWritingFails(int handle)
 
 QString whySyncFails(int handle)
 {
-    // Other errors say that this is no file that could be waited for.
+    // Other errors say that this file cannot be waited for.
     const bool isLost = fsync(handle) != 0 && (errno == EIO || errno == ENOSPC || errno == EDQUOT);
     return isLost ? QString::fromStdString(std::generic_category().message(errno)) : QString();
 }

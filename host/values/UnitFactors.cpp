@@ -54,7 +54,7 @@ constexpr std::array<AngleRow, 3> angles = {{
 
 /// Whether each row is at the place of its unit, where it is looked up.
 template <typename Rows>
-constexpr bool standInOrder(const Rows &rows)
+constexpr bool areInOrder(const Rows &rows)
 {
     for (std::size_t i = 0; i < rows.size(); ++i) {
         if (static_cast<std::size_t>(rows[i].unit) != i) {
@@ -63,7 +63,7 @@ constexpr bool standInOrder(const Rows &rows)
     }
     return true;
 }
-static_assert(standInOrder(lengths) && standInOrder(areas) && standInOrder(angles));
+static_assert(areInOrder(lengths) && areInOrder(areas) && areInOrder(angles));
 
 template <typename Unit, typename Rows>
 const typename Rows::value_type &rowOf(const Rows &rows, Unit unit)

@@ -1,5 +1,6 @@
 #include "XmlStream.h"
 
+#include "Windows1252.h"
 #include "Xlate.h"
 
 #include <algorithm>
@@ -14,12 +15,6 @@ namespace
 {
 
 constexpr std::size_t blockSize = std::size_t(1) << 16;
-
-/// The characters of Windows' western code page from 0x80 to 0x9F; -1 where it has none.
-constexpr std::array<int, 32> westernSigns = {0x20AC, -1,     0x201A, 0x0192, 0x201E, 0x2026, 0x2020, 0x2021,
-                                              0x02C6, 0x2030, 0x0160, 0x2039, 0x0152, -1,     0x017D, -1,
-                                              -1,     0x2018, 0x2019, 0x201C, 0x201D, 0x2022, 0x2013, 0x2014,
-                                              0x02DC, 0x2122, 0x0161, 0x203A, 0x0153, -1,     0x017E, 0x0178};
 
 QString utf8(std::string_view text)
 {
@@ -115,7 +110,10 @@ struct XmlStream::Callbacks
             return XML_STATUS_ERROR;
         }
         for (int i = 0; i < 256; ++i) {
-            encoding->map[i] = i >= 0x80 && i < 0xA0 ? westernSigns[static_cast<std::size_t>(i - 0x80)] : i;
+            encoding->map[i] = i;
+        }
+        for (std::size_t i = 0; i < windows1252.size(); ++i) {
+            encoding->map[0x80 + i] = windows1252[i] != 0 ? windows1252[i] : -1;
         }
         encoding->data = nullptr;
         encoding->convert = nullptr;

@@ -3,7 +3,7 @@
 #include "JobRunner.h"
 
 #include "JobFolder.h"
-#include "PrivatePostgresPosix.h"
+#include "PrivatePostgres.h"
 #include "ReportFixture.h"
 
 #include <QFile>

@@ -3,7 +3,7 @@
 #include <gtest/gtest.h>
 
 using kareport::isControl;
-using kareport::standsAlone;
+using kareport::needsNoShaping;
 
 namespace
 {
@@ -13,7 +13,7 @@ TEST(Characters, WhatNeedsNoShaping)
     struct Row
     {
         char16_t character;
-        bool standsAlone;
+        bool needsNoShaping;
         const char *reason;
     };
     const Row rows[] = {
@@ -44,7 +44,7 @@ TEST(Characters, WhatNeedsNoShaping)
         {u'\uFE0F', false, "a variation selector"},
     };
     for (const Row &row : rows) {
-        EXPECT_EQ(standsAlone(row.character), row.standsAlone) << row.reason;
+        EXPECT_EQ(needsNoShaping(row.character), row.needsNoShaping) << row.reason;
     }
 }
 
@@ -54,7 +54,7 @@ TEST(Characters, ControlsTakeNoPlace)
          {u'\0', u'\t', u'\r', u'\n', char16_t(0x1F), char16_t(0x7F), char16_t(0x9F), u'\u2028', u'\u2029'})
     {
         EXPECT_TRUE(isControl(control)) << int(control);
-        EXPECT_FALSE(standsAlone(control)) << int(control);
+        EXPECT_FALSE(needsNoShaping(control)) << int(control);
     }
     for (const char16_t shown : {u' ', u'~', u'\u00A0', u'\u00AD', u'\u2027', u'\u202A'}) {
         EXPECT_FALSE(isControl(shown)) << int(shown);

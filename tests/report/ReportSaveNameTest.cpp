@@ -27,7 +27,7 @@ TEST(ReportSaveName, TheExtensionCountsOnlyAtTheEndAndOnlyTheFirstTime)
         {u"x.RTF.rtf", u".rtf", false, "the first one is not at the end, in any case"},
         {u"/plans.rtf/a.rtf", u".rtf", false, "a folder that holds the extension counts as earlier"},
         {u"a.rtf.pdf", u".pdf", true, "another extension earlier does no harm"},
-        {u"a.rtf ", u".rtf", false, "a blank behind it"},
+        {u"a.rtf ", u".rtf", false, "a blank after it"},
         {u"a.rt", u".rtf", false, "cut off"},
         {u"artf", u".rtf", false, "without its point"},
         {u".rtf", u".rtf", true, "the extension alone"},
@@ -39,6 +39,24 @@ TEST(ReportSaveName, TheExtensionCountsOnlyAtTheEndAndOnlyTheFirstTime)
     for (const Row &row : rows) {
         EXPECT_EQ(kareport::endsWithExtension(row.name, row.extension), row.expected)
             << row.reason << ": " << testing::PrintToString(row.name);
+    }
+}
+
+TEST(ReportSaveName, TheNameSaysWhatIsSaved)
+{
+    struct Row
+    {
+        QStringView name;
+        bool isRichText;
+        bool isPdf;
+    };
+    const Row rows[] = {
+        {u"a.rep", false, false}, {u"a.rtf", true, false},      {u"a.PDF", false, true},
+        {u"a.pdf.rtf", true, false}, {u"a.pdf.pdf", false, false}, {u"/plans.pdf/a.pdf", false, false},
+    };
+    for (const Row &row : rows) {
+        EXPECT_EQ(kareport::isRichTextName(row.name), row.isRichText) << testing::PrintToString(row.name);
+        EXPECT_EQ(kareport::isPdfName(row.name), row.isPdf) << testing::PrintToString(row.name);
     }
 }
 

@@ -1,6 +1,6 @@
 #include "PostgresObjectList.h"
 
-#include "PrivatePostgresPosix.h"
+#include "PrivatePostgres.h"
 #include "SurveyData.h"
 #include "SurveyRows.h"
 

@@ -1,4 +1,4 @@
-#include "PrivatePostgresPosix.h"
+#include "PrivatePostgres.h"
 
 #include "PostgresConnector.h"
 
