@@ -98,8 +98,9 @@ void readAngleMarks(const JsonNode &node, std::array<char, 3> &marks)
 template <typename Entry, std::size_t count, typename Value>
 QString wordOf(const Word<Entry> (&words)[count], Value value)
 {
-    const auto *found = std::find_if(std::begin(words), std::end(words),
-                                     [value](const Word<Entry> &one) { return static_cast<Value>(one.value) == value; });
+    const auto *found = std::find_if(std::begin(words), std::end(words), [value](const Word<Entry> &one) {
+        return static_cast<Value>(one.value) == value;
+    });
     return (found != std::end(words) ? found : words)->word.toString();
 }
 

@@ -90,7 +90,8 @@ qreal PageRows::plainWidth() const
             width += qreal(run.face->pitch) * run.length; // what has a glyph of its own is plain
             continue;
         }
-        if (!std::all_of(text.begin(), text.end(), [](QChar character) { return needsNoShaping(character.unicode()); })) {
+        if (!std::all_of(text.begin(), text.end(), [](QChar character) { return needsNoShaping(character.unicode()); }))
+        {
             return -1;
         }
         width += widthOf(run);

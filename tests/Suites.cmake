@@ -1,5 +1,5 @@
-# Adds a test for each suite of a test program. ctest reads this when it is started, with `program`, `folder`, `cache` and
-# `heavy`, the suites that start a heavy program of other people, set.
+# Adds a test for each suite of a test program. ctest reads this when it is started, with `program`, `folder`, `cache`,
+# `heavy`, the suites that start a heavy program of other people, and `sized`, those that have a larger size as well, set.
 if(NOT EXISTS "${program}")
     add_test("${folder}.NOT_BUILT" "${program}")
     return()
@@ -27,4 +27,10 @@ foreach(suite IN LISTS suites)
         list(APPEND labels heavy)
     endif()
     set_tests_properties("${folder}.${suite}" PROPERTIES TIMEOUT 600 LABELS "${labels}")
+    list(FIND sized "${suite}" at)
+    if(NOT at EQUAL -1)
+        add_test("${folder}.${suite}.full" "${program}" "--gtest_filter=${suite}.*")
+        set_tests_properties("${folder}.${suite}.full" PROPERTIES TIMEOUT 600 LABELS "${folder};heavy"
+                                                                  ENVIRONMENT KAREPORT_TEST_SIZE=full)
+    endif()
 endforeach()

@@ -34,12 +34,12 @@
         <translation>Der Speicher reicht dafür nicht aus</translation>
     </message>
     <message>
-        <location filename="../host/frame/UDocument.cpp"/>
+        <location filename="../host/frame/UDocumentFiles.cpp"/>
         <source>Save changes to %1?</source>
         <translation>Änderungen an %1 speichern?</translation>
     </message>
     <message>
-        <location filename="../host/frame/UDocument.cpp"/>
+        <location filename="../host/frame/UDocumentFiles.cpp"/>
         <source>Untitled</source>
         <translation>Unbenannt</translation>
     </message>
@@ -645,6 +645,11 @@
         <translation>%1 %</translation>
     </message>
     <message>
+        <location filename="../view/UReportViewPageSetup.cpp"/>
+        <source>Failed to get default printer settings.</source>
+        <translation>Die Einstellungen des Standarddruckers konnten nicht abgerufen werden.</translation>
+    </message>
+    <message>
         <location filename="../view/UReportViewPrint.cpp"/>
         <source>The margins leave no room for text on the paper. Choose smaller margins under Page Setup.</source>
         <translation>Die Ränder lassen auf dem Papier keinen Platz für Text. Bitte unter „Seite einrichten“ kleinere Ränder wählen.</translation>
@@ -668,11 +673,6 @@
         <location filename="../view/UReportViewPrint.cpp"/>
         <source>The preview shows the first %1 pages. All pages are printed.</source>
         <translation>Die Vorschau zeigt die ersten %1 Seiten. Gedruckt werden alle Seiten.</translation>
-    </message>
-    <message>
-        <location filename="../view/UReportViewPrint.cpp"/>
-        <source>Failed to get default printer settings.</source>
-        <translation>Die Einstellungen des Standarddruckers konnten nicht abgerufen werden.</translation>
     </message>
     <message>
         <location filename="../ui/CReportToolBar.cpp"/>

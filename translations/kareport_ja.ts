@@ -34,12 +34,12 @@
         <translation>メモリが足りません</translation>
     </message>
     <message>
-        <location filename="../host/frame/UDocument.cpp"/>
+        <location filename="../host/frame/UDocumentFiles.cpp"/>
         <source>Save changes to %1?</source>
         <translation>%1 への変更を保存しますか?</translation>
     </message>
     <message>
-        <location filename="../host/frame/UDocument.cpp"/>
+        <location filename="../host/frame/UDocumentFiles.cpp"/>
         <source>Untitled</source>
         <translation>無題</translation>
     </message>
@@ -645,6 +645,11 @@
         <translation>%1%</translation>
     </message>
     <message>
+        <location filename="../view/UReportViewPageSetup.cpp"/>
+        <source>Failed to get default printer settings.</source>
+        <translation>通常使うプリンターの設定を取得できませんでした。</translation>
+    </message>
+    <message>
         <location filename="../view/UReportViewPrint.cpp"/>
         <source>The margins leave no room for text on the paper. Choose smaller margins under Page Setup.</source>
         <translation>余白が大きく、用紙に印字できる範囲がありません。「ページ設定」で余白を小さくしてください。</translation>
@@ -668,11 +673,6 @@
         <location filename="../view/UReportViewPrint.cpp"/>
         <source>The preview shows the first %1 pages. All pages are printed.</source>
         <translation>プレビューには最初の %1 ページが表示されます。印刷は全ページに対して行われます。</translation>
-    </message>
-    <message>
-        <location filename="../view/UReportViewPrint.cpp"/>
-        <source>Failed to get default printer settings.</source>
-        <translation>通常使うプリンターの設定を取得できませんでした。</translation>
     </message>
     <message>
         <location filename="../ui/CReportToolBar.cpp"/>

@@ -27,7 +27,7 @@ UReportDoc *runJob(Desk &desk, const JobFolder &folder, const char *name, const 
     return Desk::reports().back();
 }
 
-TEST(ActivePaneDesk, AfterAJobNothingReachesTheViewThatNobodySees)
+TEST(ActivePaneDesk, AfterAJobNothingReachesTheHiddenView)
 {
     Desk desk;
     desk.answer = MessageAnswer::No;

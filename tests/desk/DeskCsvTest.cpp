@@ -25,7 +25,7 @@ TEST(DeskCsv, ThatIsCutShortWhileAJobReadsItIsSaidAndLeavesNoReport)
     EXPECT_TRUE(desk.messages.front().contains(QStringLiteral("points.csv"))) << desk.messages.front().toStdString();
     EXPECT_TRUE(desk.messages.front().contains(QStringLiteral("the file was cut short while it was read")))
         << desk.messages.front().toStdString();
-    EXPECT_TRUE(Desk::reports().empty()) << "half a report is none";
+    EXPECT_TRUE(Desk::reports().empty()) << "half a report is not opened";
 
     desk.messages.clear();
     folder.put("points.csv", "Number,Northing\n1,12.5\n2A,0\n");

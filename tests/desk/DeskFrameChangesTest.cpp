@@ -50,7 +50,7 @@ TEST(DeskFrameChanges, AFileThatChangesOnTheDiskIsOfferedAgain)
     }
 }
 
-TEST(DeskFrameChanges, ItsOwnSavesAreNoChangesOfOthers)
+TEST(DeskFrameChanges, ItsOwnSavesAreNotChangesOfOthers)
 {
     const JobFolder folder;
     folder.put("a.rep", savedText("TALVEN"));
@@ -116,7 +116,7 @@ TEST(DeskFrameChanges, WhatIsTypedAfterAReportWasGivenUpIsNotThrownAway)
         const char *reason;
     };
     for (const Row &row :
-         {Row{false, "not to be saved, and nobody can see it"}, Row{true, "the answer was about what there was then"}})
+         {Row{false, "not to be saved, and not to be seen"}, Row{true, "the answer was about what there was then"}})
     {
         Desk desk;
         desk.answer = MessageAnswer::No;

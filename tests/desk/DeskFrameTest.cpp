@@ -41,7 +41,7 @@ TEST(DeskFrame, OpensWhatItIsGiven)
         {"b.rtf", "{\\rtf1 x}", "{\\rtf1 x}\n", "", "rich text keeps its source in the document"},
         {"empty.rep", "", "", "", "an empty file is an empty report"},
         {"bad.json", "{\"report\": [{\"lin\": 1}]}", nullptr, "bad.json:1:", "a job with a mistake says where"},
-        {"no.json", "[1", nullptr, "no.json", "a text that is no JSON"},
+        {"no.json", "[1", nullptr, "no.json", "a text that is not JSON"},
         {"bad2.json", R"({"report": [{"table": "T", "data": "d"}], "data": {"d": {"csv": "gone.csv"}},
                           "template": {"file": "gone.xml", "name": "N"}})",
          nullptr, "gone.xml", "a missing template is named"},
@@ -113,7 +113,7 @@ TEST(DeskFrame, AJobRunsIntoAReportWindow)
     window->ShowReport();
     const auto docks = desk.frame->findChildren<QDockWidget *>(QString(), Qt::FindDirectChildrenOnly);
     EXPECT_EQ(std::count_if(docks.begin(), docks.end(), [](const QDockWidget *dock) { return !dock->isHidden(); }), 1)
-        << "the report stands in one pane";
+        << "the report is shown in one pane";
     EXPECT_FALSE(window->isCreated());
     ASSERT_TRUE(QTest::qWaitFor([&desk] { return desk.frame->GetActiveView() != nullptr; }))
         << "commands are for what is there";
@@ -135,7 +135,7 @@ TEST(DeskFrame, AReportWhoseWindowIsClosedCloses)
     ASSERT_TRUE(UReportDoc::IsReportAvailable(report));
     dynamic_cast<UReportWindowDlg *>(report->GetReportWindow())->OnPressCloseButton();
     EXPECT_TRUE(QTest::qWaitFor([report] { return !UReportDoc::IsReportAvailable(report); }))
-        << "nobody could ever see it again";
+        << "it could never be seen again";
     EXPECT_EQ(desk.messages.size(), 1) << "asked once";
 }
 

@@ -100,7 +100,7 @@ TEST(DeskFrameWindows, CommandsFollowWhetherAReportIsOpen)
     for (const unsigned id : needing) {
         EXPECT_TRUE(desk.frame->CommandAction(id)->isEnabled()) << id;
     }
-    EXPECT_FALSE(desk.frame->CommandAction(updateTextCommand)->isEnabled()) << "the report is nobody's object";
+    EXPECT_FALSE(desk.frame->CommandAction(updateTextCommand)->isEnabled()) << "the report has no object";
     EXPECT_TRUE(desk.frame->CommandAction(viewToolBarCommand)->isChecked());
     ASSERT_TRUE(desk.frame->OnCommand(viewToolBarCommand));
     desk.frame->UpdateCommands();
@@ -197,7 +197,7 @@ TEST(DeskFrameWindows, AKeyGoesFromReportToReport)
         << "with the keyboard";
     EXPECT_TRUE(reports[2]->IsEmpty()) << "and nothing is typed";
     reports[0]->GetViews().front()->GetParentPane()->ShowPane(false); // as while an editor has it
-    EXPECT_EQ(press(forward), reports[1]) << "what nobody can see is passed over";
+    EXPECT_EQ(press(forward), reports[1]) << "what cannot be seen is skipped";
     desk.answer = MessageAnswer::No;
 }
 

@@ -8,6 +8,7 @@
 #include "SaveAs.h"
 #include "SaveDialog.h"
 #include "SavedReports.h"
+#include "TestSize.h"
 #include "TextFile.h"
 #include "UReportView.h"
 #include "UReportWindowDlg.h"
@@ -24,9 +25,13 @@
 namespace
 {
 
-constexpr int lineCount = 200'000; // more than are read in a moment
+/// More lines than are read in a moment.
+int lineCount()
+{
+    return testSize(60'000, 200'000);
+}
 
-QByteArray longFile(int lines = lineCount, const char *first = "TALVEN first line")
+QByteArray longFile(int lines = lineCount(), const char *first = "TALVEN first line")
 {
     QByteArray content = "\xEF\xBB\xBF" + QByteArray(first) + "\r\r\n";
     for (int line = 1; line < lines; ++line) {
@@ -68,7 +73,7 @@ TEST(DeskLongReport, IsReadWhileTheWindowsAnswer)
     EXPECT_TRUE(Desk::textOf(report) == textOfFile(content));
     EXPECT_FALSE(report.IsModified());
     EXPECT_EQ(report.GetPathName(), folder.path("a.rep"));
-    EXPECT_EQ(report.GetLineCount(), lineCount);
+    EXPECT_EQ(report.GetLineCount(), lineCount());
     EXPECT_TRUE(editOf(report).isLoading()) << "the window shows its beginning";
     EXPECT_TRUE(editOf(report).isReadOnly());
     ASSERT_TRUE(isShownWhole(report));
@@ -136,7 +141,7 @@ private:
 
 TEST(DeskLongReport, ThatWasMadeOpensInItsViewWhileTheWindowsAnswer)
 {
-    constexpr int lines = 100'000;
+    const int lines = testSize(40'000, 100'000);
     Desk desk;
     desk.answer = MessageAnswer::No;
     UReportDoc *report = CreateReportWindow(QStringLiteral("R"), false, false);
@@ -194,7 +199,7 @@ TEST(DeskLongReport, LeavesRoomForOthersMeanwhile)
     const QByteArray content = longFile();
     folder.put("a.rep", content);
     folder.put("b.rep", "\xEF\xBB\xBFTALVEN b\r\r\n");
-    folder.put("c.rep", longFile(lineCount, "TALVEN c"));
+    folder.put("c.rep", longFile(lineCount(), "TALVEN c"));
     Desk desk;
     meanwhile([&] {
         EXPECT_TRUE(desk.frame->OpenFile(folder.path("b.rep")));
@@ -329,8 +334,7 @@ TEST(DeskLongReport, ThatTheUserDoesNotWaitForAfterAChangeOnTheDiskCountsAsChang
     QTimer stopping;
     QObject::connect(&stopping, &QTimer::timeout, &stopping, [] { kareport::stopWorkAside(nullptr, {}); });
     stopping.start(0);
-    EXPECT_TRUE(QTest::qWaitFor([report] { return report->IsModified(); }))
-        << "what is shown stands in no file any more";
+    EXPECT_TRUE(QTest::qWaitFor([report] { return report->IsModified(); })) << "what is shown is in no file any more";
     EXPECT_EQ(desk.messages.size(), 1) << "only the question";
     EXPECT_EQ(Desk::textOf(*report), QStringLiteral("TALVEN short\n"));
     desk.answer = MessageAnswer::No;

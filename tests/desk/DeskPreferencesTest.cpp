@@ -45,7 +45,7 @@ TEST(DeskPreferences, WhatIsWrittenIsReadAgain)
         settings.bearingPadding = static_cast<qint16>(upTo(1));
         settings.bearingReference = static_cast<unsigned>(upTo(1));
         for (char &mark : settings.angleMarks) {
-            mark = static_cast<char>(upTo(255)); // 0 is no mark; above 127 is Latin-1
+            mark = static_cast<char>(upTo(255)); // 0 means no mark; above 127 is Latin-1
         }
         DeskPreferences preferences;
         preferences.settings = settings;
@@ -56,7 +56,7 @@ TEST(DeskPreferences, WhatIsWrittenIsReadAgain)
     setProfileStore(makeMemoryProfile());
 }
 
-TEST(DeskPreferences, SpoiledPreferencesAreNoPreferences)
+TEST(DeskPreferences, SpoiledPreferencesAreNotTaken)
 {
     for (const char *text : {"", "x", "{\"lengthUnit\": \"ell\"}", "{\"surprise\": 1}", "[]"}) {
         setProfileStore(makeMemoryProfile());

@@ -1,6 +1,7 @@
 #include "ModelledReport.h"
 #include "RandomRuns.h"
 #include "RandomSequence.h"
+#include "TestSize.h"
 
 #include <memory>
 
@@ -111,7 +112,7 @@ std::string foundWith(quint64 seed, bool longTexts)
 
 TEST(DocumentAndViewsRandom, AgreeWithThePlainModel)
 {
-    RandomRuns runs("Document and views", 2024, 150);
+    RandomRuns runs("Document and views", 2024, testSize(40, 150));
     while (runs.next()) {
         ASSERT_EQ(foundWith(runs.seed(), false), "");
     }
@@ -119,7 +120,7 @@ TEST(DocumentAndViewsRandom, AgreeWithThePlainModel)
 
 TEST(DocumentAndViewsRandom, AgreeWithThePlainModelWhileLongTextsAreLoaded)
 {
-    RandomRuns runs("Long documents and views", 4048, 6);
+    RandomRuns runs("Long documents and views", 4048, testSize(2, 6));
     while (runs.next()) {
         ASSERT_EQ(foundWith(runs.seed(), true), "");
     }
@@ -140,7 +141,7 @@ TEST(DocumentAndViewsRandom, SequencesThatWereFound)
           {ReportOp::Rows, 976, 2227, 851},
           {ReportOp::TypeOver, 51, 3135, 471},
           {ReportOp::Undo, 438, 4587, 831}},
-         "the end of a header line is none"},
+         "the end of a header line is not one itself"},
         {{{ReportOp::Rows, 14, 0, 0}, {ReportOp::Cut, 0, 40, 501}, {ReportOp::Undo, 0, 0, 0}},
          "a cut over a page's start, undone"},
         {{{ReportOp::LineFeed, 7, 0, 0}, {ReportOp::NewPage, 0, 0, 0}},
@@ -157,7 +158,7 @@ TEST(DocumentAndViewsRandom, SequencesThatWereFound)
         {{{ReportOp::TypeOver, 877, 1652, 272, 1},
           {ReportOp::WriteLine, 539, 2722, 175, 1},
           {ReportOp::TakeAll, 946, 1662, 70, 1}},
-         "a page that began within a line is none when the text is taken whole, though the line reads like a header"},
+         "a page that began within a line is lost when the text is taken whole, though the line reads like a header"},
         {{{ReportOp::SetData, 941, 1838, 619},
           {ReportOp::Type, 670, 2508, 137},
           {ReportOp::TypeOver, 749, 1814, 135},

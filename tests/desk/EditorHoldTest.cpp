@@ -17,7 +17,8 @@ public:
     {
         folder_.put("open", "");
         folder_.put("editor", "#!/bin/sh\ntouch \"" + QFile::encodeName(folder_.path("started")) + "\"\nwhile [ -e \"" +
-                                  QFile::encodeName(folder_.path("open")) + "\" ]; do sleep 0.05; done\n");
+                                  QFile::encodeName(folder_.path("open")) + "\" ]; do sleep 0.05; done\ntouch \"" +
+                                  QFile::encodeName(folder_.path("ended")) + "\"\n");
         QFile::setPermissions(path(), QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
     }
     ~WaitingEditor() { close(); }
@@ -26,6 +27,7 @@ public:
 
     QString path() const { return folder_.path("editor"); }
     bool hasStarted() const { return QFile::exists(folder_.path("started")); }
+    bool hasEnded() const { return QFile::exists(folder_.path("ended")); }
     void close() const { QFile::remove(folder_.path("open")); }
 
 private:
@@ -63,38 +65,54 @@ TEST(EditorHold, AReportStaysOpenWhileItsEditorIs)
     }
 }
 
-TEST(EditorHold, TheLastOfSeveralEditorsReleasesIt)
+/// A report that an editor shows.
+UReportDoc *reportIn(const WaitingEditor &editor)
 {
-    const WaitingEditor first;
-    const WaitingEditor second;
-    Desk desk;
-    preferEditor(first.path(), true);
-    UReportDoc *report = CreateReport(QStringLiteral("R"), false, true, nullptr, 0, nullptr);
-    report->WriteLine(QStringLiteral("x"), 0, 1, 0);
-    report->UpdateAllViews(nullptr);
-    preferEditor(second.path(), true);
-    report->UpdateAllViews(nullptr);
-    EXPECT_TRUE(QTest::qWaitFor([&] { return first.hasStarted() && second.hasStarted(); }));
-    first.close();
-    QTest::qWait(1200); // longer than the editors are looked after
-    EXPECT_FALSE(report->EnableCloseOption());
-    second.close();
-    EXPECT_TRUE(QTest::qWaitFor([report] { return report->EnableCloseOption(); }));
-    desk.answer = MessageAnswer::No;
-}
-
-TEST(EditorHold, AReportThatHasGoneMeanwhileIsNotTouched)
-{
-    const WaitingEditor editor;
-    Desk desk;
     preferEditor(editor.path(), true);
     UReportDoc *report = CreateReport(QStringLiteral("R"), false, true, nullptr, 0, nullptr);
     report->WriteLine(QStringLiteral("x"), 0, 1, 0);
     report->UpdateAllViews(nullptr);
     EXPECT_TRUE(QTest::qWaitFor([&editor] { return editor.hasStarted(); }));
-    report->OnCloseDocument();
+    return report;
+}
+
+/// Closes an editor and waits until it has been found closed: another one, which is closed after it, releases its report.
+void closeAndWait(const WaitingEditor &editor, const UReportDoc &other, const WaitingEditor &itsEditor)
+{
     editor.close();
-    QTest::qWait(1200);
+    EXPECT_TRUE(QTest::qWaitFor([&editor] { return editor.hasEnded(); }));
+    itsEditor.close();
+    EXPECT_TRUE(QTest::qWaitFor([&other] { return other.EnableCloseOption(); }));
+}
+
+TEST(EditorHold, TheLastOfSeveralEditorsReleasesIt)
+{
+    const WaitingEditor first;
+    const WaitingEditor second;
+    const WaitingEditor another;
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    const UReportDoc *other = reportIn(another);
+    UReportDoc *report = reportIn(first);
+    preferEditor(second.path(), true);
+    report->UpdateAllViews(nullptr);
+    EXPECT_TRUE(QTest::qWaitFor([&second] { return second.hasStarted(); }));
+    closeAndWait(first, *other, another);
+    EXPECT_FALSE(report->EnableCloseOption());
+    second.close();
+    EXPECT_TRUE(QTest::qWaitFor([report] { return report->EnableCloseOption(); }));
+}
+
+TEST(EditorHold, AReportThatHasGoneMeanwhileIsNotTouched)
+{
+    const WaitingEditor editor;
+    const WaitingEditor another;
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    const UReportDoc *other = reportIn(another);
+    UReportDoc *report = reportIn(editor);
+    report->OnCloseDocument();
+    closeAndWait(editor, *other, another);
     EXPECT_FALSE(UReportDoc::IsReportAvailable(report));
 }
 

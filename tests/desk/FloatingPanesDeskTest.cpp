@@ -118,7 +118,7 @@ TEST_F(FloatingPanes, DoNotComeBackAtTheNextStartWithoutTheirReports)
     desk.frame->repaint();
 }
 
-TEST(DraggedPanes, StandWhereTheyWereDroppedAtOnce)
+TEST(DraggedPanes, AreWhereTheyWereDroppedAtOnce)
 {
     for (int x = -200; x <= 200; x += 100) {
         for (int y = -200; y <= 200; y += 100) {

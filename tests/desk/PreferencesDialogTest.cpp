@@ -156,7 +156,7 @@ TEST_F(PreferencesDialogs, IsNotLeftWithWhatCannotBeUsed)
           Row{true, false, "/gone", -1, "an editor that is not wanted need not be there"},
           Row{true, true, "/bin/sh", -1, "a program that is there"}, Row{true, true, "", 2, "none is named"},
           Row{true, true, "/gone", 2, "one that is not there"}, Row{true, true, "sh", 2, "not a full path"},
-          Row{true, true, "/bin", 2, "a folder"}, Row{true, true, plain.constData(), 2, "a file that is no program"},
+          Row{true, true, "/bin", 2, "a folder"}, Row{true, true, plain.constData(), 2, "a file that is not a program"},
           Row{false, true, "/bin/sh", 1, "margins as wide as the paper"}})
     {
         DeskPreferences preferences;

@@ -52,7 +52,7 @@ TEST(Recovery, WhatWasOpenComesBackAfterACrash)
     desk.answer = MessageAnswer::No;
     Recovery recovery(folder.path());
     const std::vector<KeptReport> left = recovery.leftReports();
-    ASSERT_EQ(left.size(), 3U) << "an empty report that nobody wrote into is nothing to bring back";
+    ASSERT_EQ(left.size(), 3U) << "an empty report that was never written into is nothing to bring back";
     EXPECT_EQ(left[0].title, QStringLiteral("Traverse"));
     EXPECT_EQ(left[1].path, files.path("saved.rep"));
     EXPECT_TRUE(left[1].textFile.isEmpty()) << "its own file holds all of it";
@@ -227,7 +227,7 @@ TEST(Recovery, TextsAreWrittenOnceAndGoWithTheirReports)
     EXPECT_EQ(folder.files(program).filter(QRegularExpression(QStringLiteral("^[0-9]+$"))), QStringList());
 }
 
-TEST(Recovery, SpoiledFilesAreNoReports)
+TEST(Recovery, SpoiledFilesAreNotReports)
 {
     struct Row
     {
@@ -279,7 +279,7 @@ private:
 
 const QString programName = QStringLiteral("0a1b2c3d-0000-4000-8000-00000000000");
 
-TEST(Recovery, LinksAreNotFollowedAndForeignFoldersAreNobodysBusiness)
+TEST(Recovery, LinksAreNotFollowedAndForeignFoldersAreLeftAlone)
 {
     const CrashFolder folder;
     const ForeignFiles foreign;
@@ -305,7 +305,7 @@ TEST(Recovery, LinksAreNotFollowedAndForeignFoldersAreNobodysBusiness)
         Recovery recovery(folder.path());
         const std::vector<KeptReport> left = recovery.leftReports();
         ASSERT_EQ(left.size(), 2U);
-        EXPECT_EQ(kareport::reopenReport(left[0]), nullptr) << "its text is a link to somebody else's file";
+        EXPECT_EQ(kareport::reopenReport(left[0]), nullptr) << "its text is a link to a file of another user";
         EXPECT_NE(kareport::reopenReport(left[1]), nullptr);
         EXPECT_EQ(recovery.unreadableFolders(), QStringList{linked});
         foreign.expectWhole("read");

@@ -42,8 +42,8 @@ TEST(SaveAs, TheEndingFollowsTheKind)
         {"/road/plan 2.1", "*.rtf", "/road/plan 2.1.rtf", "no kind has this ending"},
         {"/road/plan.txt", "*", "/road/plan.txt", "all files: as it was typed"},
         {"/road/plan.", "*.pdf", "/road/plan.pdf", "the dot alone"},
-        {"/road.rtf/plan", "*.rep", "/road.rtf/plan.rep", "a folder's ending is none"},
-        {"/road/rtf", "*.rtf", "/road/rtf.rtf", "without the dot it is no ending"},
+        {"/road.rtf/plan", "*.rep", "/road.rtf/plan.rep", "a folder's ending does not count"},
+        {"/road/rtf", "*.rtf", "/road/rtf.rtf", "without the dot it is not an ending"},
     };
     for (const Row &row : rows) {
         EXPECT_EQ(kareport::withEndingOf(QLatin1String(row.typed), QLatin1String(row.kind), kinds),
@@ -124,7 +124,7 @@ TEST(SaveAs, ATypedNameGetsTheEndingThatTheDialogShows)
         {"in.rtf", nullptr, "out", "out.rtf", "what was opened as rich text is offered as rich text"},
         {"in.rtf", nullptr, "out.rep", "out.rep", "the user may name another kind"},
         {"in.rtf", "Report Files (*.rep)", "out", "out.rep", "or choose it"},
-        {nullptr, "RTF Files (*.rtf)", "out 2.1", "out 2.1.rtf", "a number is no ending"},
+        {nullptr, "RTF Files (*.rtf)", "out 2.1", "out 2.1.rtf", "a number is not an ending"},
         {nullptr, "All Files (*)", "out", "out", "all files: as it was typed"},
     };
     for (const Row &row : rows) {

@@ -135,7 +135,7 @@ TEST_F(TemplateDialogs, ListsWhatAFileHolds)
     EXPECT_EQ(job.data, folder.path("points.csv"));
     choose(dialog, "Table or block", 1);
     job = dialog.job();
-    EXPECT_EQ(job.block, QStringLiteral("Point")) << "the blocks stand behind the tables";
+    EXPECT_EQ(job.block, QStringLiteral("Point")) << "the blocks are listed after the tables";
     EXPECT_TRUE(job.table.isEmpty());
 }
 

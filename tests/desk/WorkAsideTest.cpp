@@ -59,9 +59,9 @@ TEST(WorkAside, LetsTheWindowsAnswer)
 TEST(WorkAside, ThatIsDoneInAMomentShowsNothing)
 {
     bool isShown = false;
-    QTimer looking;
-    QObject::connect(&looking, &QTimer::timeout, &looking, [&] { isShown = isShown || shownDialog() != nullptr; });
-    looking.start(step);
+    QTimer lookTimer;
+    QObject::connect(&lookTimer, &QTimer::timeout, &lookTimer, [&] { isShown = isShown || shownDialog() != nullptr; });
+    lookTimer.start(step);
     EXPECT_TRUE(doAside(QString(), UserInput::Taken,
                         [](AsideState &) { std::this_thread::sleep_for(std::chrono::milliseconds(100)); }));
     EXPECT_FALSE(isShown);
@@ -85,15 +85,15 @@ TEST(WorkAside, IsShownAndCanBeStopped)
     for (const Row &row : rows) {
         QString label;
         int value = -1;
-        QTimer looking;
-        QObject::connect(&looking, &QTimer::timeout, &looking, [&] {
+        QTimer lookTimer;
+        QObject::connect(&lookTimer, &QTimer::timeout, &lookTimer, [&] {
             if (QProgressDialog *dialog = shownDialog(); dialog != nullptr && label.isEmpty()) {
                 label = dialog->findChild<QLabel *>()->text();
                 value = dialog->value();
                 row.stop(*dialog);
             }
         });
-        looking.start(step);
+        lookTimer.start(step);
         EXPECT_FALSE(doAside(QStringLiteral("<b>what</b>"), row.input, [](AsideState &state) {
             state.setPercent(42);
             waitUntilStopped(state);
@@ -129,7 +129,7 @@ TEST(WorkAside, IsStoppedAsAWhole)
         QTimer::singleShot(0, [&] {
             EXPECT_TRUE(kareport::stopWorkAside(&context, [&isDone] { isDone = true; }));
             QCoreApplication::processEvents();
-            EXPECT_FALSE(isDone) << "somebody still waits";
+            EXPECT_FALSE(isDone) << "the work is still waited for";
         });
         isInnerDone = doAside(QString(), UserInput::Taken, waitUntilStopped);
     });

@@ -3,6 +3,7 @@
 #include "FailingFiles.h"
 #include "FrameFixture.h"
 #include "ReportFixture.h"
+#include "TestSize.h"
 
 #include <QDir>
 #include <QFileInfo>
@@ -57,5 +58,5 @@ void failEachCall(const QString &path, Prepare prepare, Save save, Failed failed
 /// A report's text of more than is buffered at once.
 inline QString longText()
 {
-    return reportLines(QStringLiteral("a line of a report \u6E2C\n").repeated(10000));
+    return reportLines(QStringLiteral("a line of a report \u6E2C\n").repeated(testSize(3'000, 10'000)));
 }

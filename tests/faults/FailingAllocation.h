@@ -12,7 +12,7 @@ public:
     enum class Extent
     {
         One,
-        AllAfter ///< also those that come after it: whoever asks again, for less, gets nothing either
+        AllAfter ///< also those that come after it: a second request, for less, fails as well
     };
 
     /// @param number  which request from now on fails, from 1; 0 for none

@@ -134,7 +134,7 @@ TEST(LostText, IsWrittenNowhere)
     }
 }
 
-TEST(LostText, IsNoOutput)
+TEST(LostText, IsNotAnOutput)
 {
     using kareport::OutputKind;
     const Surroundings around;

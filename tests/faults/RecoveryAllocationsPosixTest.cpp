@@ -46,7 +46,7 @@ TEST(RecoveryAllocations, AReportIsOpenedAgainWholeOrNotAtAll)
             EXPECT_NO_THROW(report = kareport::reopenReport(kept)) << number;
             hasFailed = failing.hasFailed();
         }
-        EXPECT_EQ(documents.size(), before + (report != nullptr ? 1 : 0)) << number << ": an empty report is none";
+        EXPECT_EQ(documents.size(), before + (report != nullptr ? 1 : 0)) << number << ": an empty report is not left";
         if (report != nullptr) {
             EXPECT_EQ(report->GetTextLength(), longText) << number;
             report->OnCloseDocument();
@@ -79,7 +79,7 @@ TEST(RecoveryAllocations, WithoutMemoryTheTextThatWasKeptBeforeStays)
             hasFailed = failing.hasFailed();
         }
         if (!isKept) {
-            EXPECT_TRUE(content(file) == before) << number << ": half a text is none";
+            EXPECT_TRUE(content(file) == before) << number << ": half a text is not written";
             EXPECT_TRUE(recovery.keep()) << number << ": the next turn tries again";
         }
         before = content(file);

@@ -113,7 +113,7 @@ void ReportAllocations::checkText(const UReportDoc &report, const QString &befor
     case Text::Same: EXPECT_TRUE(text == before) << text.toStdString(); break;
     case Text::Written:
         EXPECT_TRUE(text.startsWith(before)) << text.toStdString();
-        EXPECT_TRUE(isDone || text == before || report.HasLostText()) << "half of it, and nobody knows";
+        EXPECT_TRUE(isDone || text == before || report.HasLostText()) << "half of it, and nothing says so";
         break;
     case Text::Replaced: EXPECT_TRUE(isDone || text == before) << text.toStdString(); break;
     case Text::Set:

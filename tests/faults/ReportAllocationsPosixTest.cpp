@@ -371,7 +371,7 @@ TEST(ReportAllocation, ClosingAReportInTwoPanesNeedsNoMemory)
     }
     const FailingAllocation failing(1);
     EXPECT_NO_THROW(report->OnCloseDocument());
-    EXPECT_FALSE(failing.hasFailed()) << "a view that goes has nobody to tell";
+    EXPECT_FALSE(failing.hasFailed()) << "a view that is closed has nothing to tell";
     EXPECT_FALSE(UReportDoc::IsReportAvailable(report));
 }
 

@@ -168,8 +168,9 @@ TEST(ReportSaves, AConvertedReportIsWholeOrNotWritten)
 {
     const FixedSurroundings surroundings;
     const JobFolder folder;
-    folder.put("in.rep", "\xEF\xBB\xBF" + QByteArray("a line of a report\r\r\n").repeated(5000));
-    folder.put("in.rtf", "{\\rtf1 " + QByteArray("a line of a report\\par\r\n").repeated(5000) + '}');
+    const int lines = testSize(2'000, 5'000);
+    folder.put("in.rep", "\xEF\xBB\xBF" + QByteArray("a line of a report\r\r\n").repeated(lines));
+    folder.put("in.rtf", "{\\rtf1 " + QByteArray("a line of a report\\par\r\n").repeated(lines) + '}');
     for (const char *in : {"in.rep", "in.rtf"}) {
         for (const char *out : {"a.rep", "a.txt", "a.rtf", "a.pdf"}) {
             SCOPED_TRACE(std::string(in) + " to " + out);

@@ -102,89 +102,91 @@ TEST_F(TemplateAllocations, ATemplateIsLoadedWholeOrNotAtAll)
     EXPECT_GT(allocations, 50);
 }
 
+/// What is asked of a loaded template and of a table of it.
+struct Question
+{
+    const char *name;
+    QStringList (*ask)(UXmlReportTpl &tpl, UXmlReportTable &table);
+};
+QStringList names;
+std::vector<quint32> ids;
+const QString points = QStringLiteral("Points");
+const QString northing = QStringLiteral("NORTHING");
+const QString survey = QStringLiteral("SURVEY");
+// The answers stay empty where there is none; what a test itself asks for is asked for before.
+const Question questions[] = {
+    {"GetAllTPLsByName",
+     [](UXmlReportTpl &tpl, UXmlReportTable &) {
+         tpl.GetAllTPLsByName(names);
+         return names;
+     }},
+    {"GetAllTPLsByTitle",
+     [](UXmlReportTpl &tpl, UXmlReportTable &) {
+         tpl.GetAllTPLsByTitle(names);
+         return names;
+     }},
+    {"GetAllTables",
+     [](UXmlReportTpl &tpl, UXmlReportTable &) {
+         tpl.GetAllTables(names);
+         return names;
+     }},
+    {"GetAllBlocks",
+     [](UXmlReportTpl &tpl, UXmlReportTable &) {
+         tpl.GetAllBlocks(names);
+         return names;
+     }},
+    {"GetAllDictionaries",
+     [](UXmlReportTpl &tpl, UXmlReportTable &) {
+         tpl.GetAllDictionaries(names);
+         return names;
+     }},
+    {"records of a name",
+     [](UXmlReportTpl &tpl, UXmlReportTable &) {
+         const bool areFound = tpl.GetTable(points) != nullptr && tpl.GetBlock(QStringLiteral("Site")) != nullptr &&
+                               tpl.GetDictionary(survey) != nullptr && tpl.GetSortList(points) != nullptr;
+         return areFound ? names : QStringList();
+     }},
+    {"FindVariable",
+     [](UXmlReportTpl &tpl, UXmlReportTable &) {
+         qint32 id = -1;
+         qint32 type = -1;
+         const bool isFound = tpl.FindVariable(survey, northing, id, type);
+         EXPECT_EQ(isFound, id == 2) << "and nothing is changed where it is not found";
+         return isFound ? names : QStringList();
+     }},
+    {"LoadTable",
+     [](UXmlReportTpl &tpl, UXmlReportTable &table) {
+         const bool isLoaded = table.LoadTable(points, &tpl);
+         EXPECT_EQ(isLoaded, table.IsLoaded());
+         return table.IsLoaded() ? names : QStringList();
+     }},
+    {"ReorderingHeading",
+     [](UXmlReportTpl &tpl, UXmlReportTable &table) {
+         EXPECT_TRUE(tpl.SetNorthEastTableFieldOrder(points, ORDER_EASTING_NORTHING));
+         table.ReorderingHeading();
+         return table.IsLoaded() ? names : QStringList();
+     }},
+    {"GetSortList",
+     [](UXmlReportTpl &, UXmlReportTable &table) {
+         const bool isListed = table.GetSortList(ids);
+         EXPECT_EQ(isListed, !ids.empty());
+         return ids.empty() ? QStringList() : names;
+     }},
+    {"GetColumnSeparator",
+     [](UXmlReportTpl &, UXmlReportTable &table) {
+         return table.GetColumnSeparator().isEmpty() ? QStringList() : names;
+     }},
+    {"LoadBlock",
+     [](UXmlReportTpl &tpl, UXmlReportTable &) {
+         UXmlReportBlock block;
+         EXPECT_TRUE(block.LoadBlock(QStringLiteral("Site"), &tpl)) << "which needs no memory";
+         return block.GetFieldsCount() == 1 ? names : QStringList();
+     }},
+};
+
 TEST_F(TemplateAllocations, WhatIsAskedOfATemplateIsAnsweredWholeOrNotAtAll)
 {
-    struct Row
-    {
-        const char *name;
-        QStringList (*ask)(UXmlReportTpl &tpl, UXmlReportTable &table);
-    };
-    static QStringList names;
-    static std::vector<quint32> ids;
-    static const QString points = QStringLiteral("Points");
-    static const QString northing = QStringLiteral("NORTHING");
-    static const QString survey = QStringLiteral("SURVEY");
-    // The answers stay empty where there is none; what a test itself asks for is asked for before.
-    const Row rows[] = {
-        {"GetAllTPLsByName",
-         [](UXmlReportTpl &tpl, UXmlReportTable &) {
-             tpl.GetAllTPLsByName(names);
-             return names;
-         }},
-        {"GetAllTPLsByTitle",
-         [](UXmlReportTpl &tpl, UXmlReportTable &) {
-             tpl.GetAllTPLsByTitle(names);
-             return names;
-         }},
-        {"GetAllTables",
-         [](UXmlReportTpl &tpl, UXmlReportTable &) {
-             tpl.GetAllTables(names);
-             return names;
-         }},
-        {"GetAllBlocks",
-         [](UXmlReportTpl &tpl, UXmlReportTable &) {
-             tpl.GetAllBlocks(names);
-             return names;
-         }},
-        {"GetAllDictionaries",
-         [](UXmlReportTpl &tpl, UXmlReportTable &) {
-             tpl.GetAllDictionaries(names);
-             return names;
-         }},
-        {"records of a name",
-         [](UXmlReportTpl &tpl, UXmlReportTable &) {
-             const bool areFound = tpl.GetTable(points) != nullptr && tpl.GetBlock(QStringLiteral("Site")) != nullptr &&
-                                   tpl.GetDictionary(survey) != nullptr && tpl.GetSortList(points) != nullptr;
-             return areFound ? names : QStringList();
-         }},
-        {"FindVariable",
-         [](UXmlReportTpl &tpl, UXmlReportTable &) {
-             qint32 id = -1;
-             qint32 type = -1;
-             const bool isFound = tpl.FindVariable(survey, northing, id, type);
-             EXPECT_EQ(isFound, id == 2) << "and nothing is changed where it is not found";
-             return isFound ? names : QStringList();
-         }},
-        {"LoadTable",
-         [](UXmlReportTpl &tpl, UXmlReportTable &table) {
-             const bool isLoaded = table.LoadTable(points, &tpl);
-             EXPECT_EQ(isLoaded, table.IsLoaded());
-             return table.IsLoaded() ? names : QStringList();
-         }},
-        {"ReorderingHeading",
-         [](UXmlReportTpl &tpl, UXmlReportTable &table) {
-             EXPECT_TRUE(tpl.SetNorthEastTableFieldOrder(points, ORDER_EASTING_NORTHING));
-             table.ReorderingHeading();
-             return table.IsLoaded() ? names : QStringList();
-         }},
-        {"GetSortList",
-         [](UXmlReportTpl &, UXmlReportTable &table) {
-             const bool isListed = table.GetSortList(ids);
-             EXPECT_EQ(isListed, !ids.empty());
-             return ids.empty() ? QStringList() : names;
-         }},
-        {"GetColumnSeparator",
-         [](UXmlReportTpl &, UXmlReportTable &table) {
-             return table.GetColumnSeparator().isEmpty() ? QStringList() : names;
-         }},
-        {"LoadBlock",
-         [](UXmlReportTpl &tpl, UXmlReportTable &) {
-             UXmlReportBlock block;
-             EXPECT_TRUE(block.LoadBlock(QStringLiteral("Site"), &tpl)) << "which needs no memory";
-             return block.GetFieldsCount() == 1 ? names : QStringList();
-         }},
-    };
-    for (const Row &row : rows) {
+    for (const Question &question : questions) {
         QStringList whole;
         failingEachAllocation([&](qint64 number) {
             UXmlReportTpl tpl;
@@ -194,19 +196,19 @@ TEST_F(TemplateAllocations, WhatIsAskedOfATemplateIsAnsweredWholeOrNotAtAll)
             names = QStringList(points);
             ids.clear();
             if (whole.isEmpty()) {
-                whole = row.ask(tpl, table);
-                EXPECT_FALSE(whole.isEmpty()) << row.name;
+                whole = question.ask(tpl, table);
+                EXPECT_FALSE(whole.isEmpty()) << question.name;
                 names = QStringList(points);
             }
             QStringList answer;
             bool hasFailed = false;
             {
                 const FailingAllocation failing(number);
-                EXPECT_NO_THROW(answer = row.ask(tpl, table)) << row.name << ' ' << number;
+                EXPECT_NO_THROW(answer = question.ask(tpl, table)) << question.name << ' ' << number;
                 hasFailed = failing.hasFailed();
             }
-            EXPECT_TRUE(answer == whole || answer.isEmpty()) << row.name << ' ' << number;
-            EXPECT_TRUE(hasFailed || !answer.isEmpty()) << row.name << ' ' << number;
+            EXPECT_TRUE(answer == whole || answer.isEmpty()) << question.name << ' ' << number;
+            EXPECT_TRUE(hasFailed || !answer.isEmpty()) << question.name << ' ' << number;
             return hasFailed && !testing::Test::HasFailure();
         });
     }
@@ -251,7 +253,7 @@ TEST_F(TemplateAllocations, ACheckWithoutMemorySaysThatItIsNotWhole)
             hasFailed = failing.hasFailed();
         }
         const bool isSaid = remarks.size() == 1 && remarks.front().isError && remarks.front().text == reason;
-        EXPECT_TRUE(isSaid || remarks.size() == whole.size()) << number << ": half a check is none";
+        EXPECT_TRUE(isSaid || remarks.size() == whole.size()) << number << ": half a check is not reported";
         return hasFailed && !testing::Test::HasFailure();
     });
     EXPECT_GT(allocations, 50);
@@ -259,7 +261,7 @@ TEST_F(TemplateAllocations, ACheckWithoutMemorySaysThatItIsNotWhole)
         std::optional<kareport::TemplateRemark> remark;
         const FailingAllocation failing(number);
         EXPECT_NO_THROW(remark = kareport::firstUnreadTemplate(unread)) << number;
-        EXPECT_TRUE(remark && remark->isError) << number << ": nobody may take the file for a good one";
+        EXPECT_TRUE(remark && remark->isError) << number << ": the file must not be taken for a good one";
         return failing.hasFailed() && !testing::Test::HasFailure();
     });
 }

@@ -26,7 +26,7 @@ qint64 allocationsOfReport(const QString &name)
     });
 }
 
-TEST(WindowAllocations, AReportWindowWithoutMemoryForItsReportIsNone)
+TEST(WindowAllocations, AReportWindowWithoutMemoryForItsReportIsNotMade)
 {
     const Surroundings around;
     const auto &documents = around.application.reportTemplate()->GetDocuments();

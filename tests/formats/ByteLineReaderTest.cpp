@@ -79,12 +79,12 @@ TEST(ByteLineReader, LongLinesComeInPieces)
         {x(1022), {piece(1022)}, "no line end"},
         {x(1023), {piece(1022), piece(1)}, "one more"},
         {x(1021) + "\r", {piece(1021, "\r")}, "a lone CR in the last place"},
-        {x(1021) + "\ra", {piece(1021, "\r"), QStringLiteral("a")}, "a lone CR in the last place, more behind it"},
+        {x(1021) + "\ra", {piece(1021, "\r"), QStringLiteral("a")}, "a lone CR in the last place, more follows"},
         {x(1021) + "\r\r\na",
          {piece(1021, "\r"), QStringLiteral("\n"), QStringLiteral("a")},
          "a saved report's line end across the pieces"},
         {x(1020) + "\r\r\n", {piece(1020, "\r\n")}, "a saved report's line that just fits"},
-        {x(1022) + "\r", {piece(1022), QStringLiteral("\r")}, "a lone CR behind the last place"},
+        {x(1022) + "\r", {piece(1022), QStringLiteral("\r")}, "a lone CR after the last place"},
         {x(1500) + "\nb", {piece(1022), piece(478, "\n"), QStringLiteral("b")}, "two pieces"},
         {x(2044) + "\n", {piece(1022), piece(1022), QStringLiteral("\n")}, "two full pieces"},
     };
@@ -107,7 +107,7 @@ QStringList expectedPieces(QByteArray bytes)
     return pieces;
 }
 
-TEST(ByteLineReader, LinesAreWholeWhereverTheyStandInTheFile)
+TEST(ByteLineReader, LinesAreWholeWhereverTheyAreInTheFile)
 {
     // Bytes are taken from the device in chunks: line ends are before, on and after the places where one ends.
     for (const int chunk : {256 * 1024, 2 * 256 * 1024}) {

@@ -28,7 +28,7 @@ int usualWidth(char32_t character)
     return character >= 0x2E80 ? 20 : 10;
 }
 
-TEST(LineBreaker, BreaksBehindTheLastBlankThatReachesTheBox)
+TEST(LineBreaker, BreaksAfterTheLastBlankThatReachesTheBox)
 {
     struct Row
     {

@@ -68,7 +68,7 @@ QRect cellsAt(double lineHeight, std::size_t line, int first, int count)
     return {qRound(margin + first * cell), qRound(top), qRound(count * cell), qRound(lineHeight)};
 }
 
-TEST(PdfExportGrid, FiguresStandInTheirColumnsAfterAnyScript)
+TEST(PdfExportGrid, FiguresAreInTheirColumnsAfterAnyScript)
 {
     const std::vector<Row> all = rows();
     const PdfReadBack pdf(pdfBytes(gridText(), gridOptions()));
@@ -82,7 +82,7 @@ TEST(PdfExportGrid, FiguresStandInTheirColumnsAfterAnyScript)
         EXPECT_NEAR(ink.box.right(), first.box.right(), 1) << all[i].reason;
         EXPECT_NEAR(ink.amount / first.amount, 1, 0.03) << all[i].reason;
         const Ink between = inkIn(picture, cellsAt(lineHeight, i, all[i].cells, figures - all[i].cells));
-        EXPECT_TRUE(between.box.isEmpty()) << all[i].reason << ": nothing stands behind its last cell";
+        EXPECT_TRUE(between.box.isEmpty()) << all[i].reason << ": nothing is drawn after its last cell";
         for (int column = 0; column < all[i].cells; ++column) {
             const bool isBlank = all[i].text.contains(u' ') || all[i].text.contains(u'│');
             EXPECT_TRUE(isBlank || !inkIn(picture, cellsAt(lineHeight, i, column, 1)).box.isEmpty())
@@ -106,7 +106,7 @@ TEST(PdfExportGrid, TheTextIsStillTheSame)
     EXPECT_EQ(pdf.check(), QString());
 }
 
-TEST(PdfExportGrid, AMarkStandsOnItsLetter)
+TEST(PdfExportGrid, AMarkIsOnItsLetter)
 {
     struct Mark
     {

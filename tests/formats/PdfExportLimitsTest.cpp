@@ -27,7 +27,7 @@ Attempt attempt(QStringView text, const PdfOptions &options)
     buffer.open(QIODevice::WriteOnly);
     PdfNotes notes;
     const bool done = writePdf(buffer, text, options, &notes);
-    EXPECT_EQ(writePdf(buffer, text, options), done) << "also when nobody asks why";
+    EXPECT_EQ(writePdf(buffer, text, options), done) << "also when the reason is not asked for";
     return {done, notes.problem, done ? QByteArray() : buffer.data()};
 }
 
@@ -61,7 +61,7 @@ TEST(PdfExportLimits, APageThatCannotBeIsRefused)
     }
 }
 
-TEST(PdfExportLimits, AFaceThatIsNoFontIsRefused)
+TEST(PdfExportLimits, AFaceThatIsNotAFontIsRefused)
 {
     const char *const names[] = {"MSGOTHIC.TTC", "lucon.TTF"};
     const QByteArray contents[] = {"", "This is a text.\n", QByteArray("\0\1\0\0", 4), QByteArray(100000, '\xFF')};
@@ -106,7 +106,7 @@ TEST(PdfExportLimits, ADeviceThatFailsEndsInFalse)
         PdfNotes notes;
         EXPECT_EQ(writePdf(device, u"A\r\n", pdfOptions(), &notes), limit == size) << limit;
         EXPECT_EQ(notes.problem, QString()) << "the device knows why";
-        EXPECT_LE(device.taken.size(), std::max<qint64>(limit, 0)) << "nothing is written behind the gap";
+        EXPECT_LE(device.taken.size(), std::max<qint64>(limit, 0)) << "nothing is written after the gap";
     }
 }
 

@@ -60,7 +60,7 @@ QByteArray libraryPdf(const QByteArray &text, const PdfOptions &options)
     return bytes;
 }
 
-TEST(PdfExportPage, TextThatFitsStandsWhereTheLibraryPutsIt)
+TEST(PdfExportPage, TextThatFitsIsWhereTheLibraryPutsIt)
 {
     struct Row
     {
@@ -100,7 +100,7 @@ TEST(PdfExportPage, TextThatFitsStandsWhereTheLibraryPutsIt)
     }
 }
 
-TEST(PdfExportPage, TheLinesOfAFullPageStandInItsBox)
+TEST(PdfExportPage, TheLinesOfAFullPageAreInItsBox)
 {
     struct Row
     {

@@ -166,7 +166,7 @@ TEST(PdfExportPicture, EveryLetterHasAllItsParts)
     }
 }
 
-TEST(PdfExportPicture, NoInkStandsOutsideTheBox)
+TEST(PdfExportPicture, NoInkIsOutsideTheBox)
 {
     QString text;
     for (int line = 1; line <= 144; ++line) {
@@ -184,7 +184,7 @@ TEST(PdfExportPicture, NoInkStandsOutsideTheBox)
         EXPECT_GE(ink.box.top(), 49) << page;
         EXPECT_LE(ink.box.right(), picture.width() - 49) << page;
         EXPECT_LE(ink.box.bottom(), picture.height() - 49) << page;
-        EXPECT_GE(ink.box.bottom(), picture.height() - 49 - 12) << page << ": the last line stands at the bottom";
+        EXPECT_GE(ink.box.bottom(), picture.height() - 49 - 12) << page << ": the last line is at the bottom";
     }
 }
 

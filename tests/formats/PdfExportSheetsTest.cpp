@@ -146,9 +146,9 @@ TEST(PdfExportSheets, BrokenLinesOfAPageGoOnOnFurtherSheets)
     EXPECT_EQ(pdf.characters(), QString(text).remove(u'\r').remove(u'\n'));
 }
 
-TEST(PdfExportSheets, APageThatIsNoneGetsTypeThatCanBeRead)
+TEST(PdfExportSheets, APageWithoutAnEndGetsTypeThatCanBeRead)
 {
-    // 100000 lines a page are meant to be no pages.
+    // 100000 lines a page mean that there are to be no pages.
     PdfOptions options = pdfOptions();
     options.page.linesPerPage = 100000;
     const PdfReadBack few(pdfBytes(lines(50), options));

@@ -17,7 +17,7 @@ using kareport::PdfOptions;
 /// The points that a character of 9 points takes.
 constexpr double characterWidth = 5.418;
 
-TEST(PdfExportText, LinesStandOnTheirPages)
+TEST(PdfExportText, LinesAreOnTheirPages)
 {
     struct Row
     {
@@ -49,7 +49,7 @@ TEST(PdfExportText, AReportWithoutLinesHasNoPage)
     const QByteArray bytes = pdfBytes(u"", pdfOptions());
     EXPECT_TRUE(bytes.startsWith("%PDF-"));
     EXPECT_TRUE(bytes.trimmed().endsWith("%%EOF"));
-    EXPECT_TRUE(bytes.contains("/Count 0")) << "the library writes it as it stands";
+    EXPECT_TRUE(bytes.contains("/Count 0")) << "the library writes it as it is";
 }
 
 TEST(PdfExportText, IsWhatIsSeenOfTheReport)

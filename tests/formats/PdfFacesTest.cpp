@@ -44,7 +44,7 @@ TEST(PdfFaces, KnowWhatTheyCover)
     }
 }
 
-TEST(PdfFaces, AFileThatIsNoFontCoversNothing)
+TEST(PdfFaces, AFileThatIsNotAFontCoversNothing)
 {
     FontFolder folder;
     folder.withText(QStringLiteral("text.ttf"), "no font").withText(QStringLiteral("empty.ttf"), "");
@@ -80,7 +80,7 @@ TEST(PdfFaces, ThePreferredOneIsLookedForByName)
         {{}, {}, false, "no folder"},
         {{none.path()}, {}, false, "an empty folder"},
         {{QStringLiteral("/no/such folder")}, {}, false, "a folder that does not exist"},
-        {{folderOfThatName.path()}, {}, false, "a folder of that name is no file"},
+        {{folderOfThatName.path()}, {}, false, "a folder of that name is not a file"},
         {{both.path()}, both.path() + u'/' + gothic, true, "the Gothic face before the other"},
         {{lucidaOnly.path()}, lucidaOnly.path() + QStringLiteral("/LUCON.ttf"), false, "case does not matter"},
         {{lucidaOnly.path(), gothicOnly.path()},
@@ -117,7 +117,7 @@ TEST(PdfFaces, TheSystemsOwnAreInTheOrderOfPreference)
     EXPECT_FALSE(kareport::systemFontFolders().isEmpty());
 }
 
-TEST(PdfFaces, TheFirstThatHasPlainTextStandsFirst)
+TEST(PdfFaces, TheFirstThatHasPlainTextComesFirst)
 {
     const PdfFace deja = dejaVu();
     const PdfFace wqy = zenHei();
@@ -136,10 +136,10 @@ TEST(PdfFaces, TheFirstThatHasPlainTextStandsFirst)
         {{}, {deja, wqy}, u"DejaVuSansMono wqy-zenhei", "both have plain text: as they are"},
         {{}, {wqy, deja}, u"wqy-zenhei DejaVuSansMono", "both have plain text: as they are"},
         {{}, {bad, wqy, deja}, u"wqy-zenhei bad DejaVuSansMono", "what has no letters makes no grid"},
-        {{}, {bad}, u"bad", "nobody has plain text: as they are"},
+        {{}, {bad}, u"bad", "none has plain text: as they are"},
         {wqy, {deja, wqy}, u"wqy-zenhei DejaVuSansMono wqy-zenhei", "the preferred one before all"},
-        {bad, {deja, wqy}, u"bad DejaVuSansMono wqy-zenhei", "it stands first whatever it covers"},
-        {deja, {}, u"DejaVuSansMono", "nobody helps out"},
+        {bad, {deja, wqy}, u"bad DejaVuSansMono wqy-zenhei", "it comes first whatever it covers"},
+        {deja, {}, u"DejaVuSansMono", "there is no other"},
     };
     for (const Row &row : rows) {
         QStringList files;

@@ -63,7 +63,7 @@ PdfPageSetup setupOf(unsigned fontSize, int linesPerPage)
     return {QSize(6000, 8000), 720, QMargins(), fontSize, linesPerPage};
 }
 
-TEST(PdfGeometry, LinesStandAsFarApartAsTheyAreHighOrAsTheyMustToFit)
+TEST(PdfGeometry, LinesAreAsFarApartAsTheyAreHighOrAsTheyMustBeToFit)
 {
     constexpr float closest = 700 / 93.6F;
     constexpr float longer = 700 / 960.F;
@@ -104,7 +104,7 @@ TEST(PdfGeometry, LinesStandAsFarApartAsTheyAreHighOrAsTheyMustToFit)
     }
 }
 
-TEST(PdfGeometry, AllLinesStandInTheBox)
+TEST(PdfGeometry, AllLinesAreInTheBox)
 {
     for (const int linesPerPage : {1, 2, 59, 60, 61, 72, 100, 500}) {
         for (const unsigned fontSize : {1U, 8U, 9U, 10U, 12U, 40U, 580U}) {
@@ -152,7 +152,7 @@ TEST(PdfGeometry, APageHasRoomForItsLinesOrForThoseOfAShortReport)
     };
     constexpr Row rows[] = {
         {60, 60, 60, "a full page"},
-        {60, 1, 60, "a short report stands as a long one does"},
+        {60, 1, 60, "a short report is placed like a long one"},
         {60, 100000, 60, "a long report"},
         {92, 1, 92, "close, but not running into each other"},
         {93, 1, 1, "a page that is too long for its font: the report's lines are what has to fit"},

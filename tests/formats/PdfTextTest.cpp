@@ -107,7 +107,7 @@ TEST(PdfText, FindsTheLinesThatAreTooWide)
         {u"12345678\r\n12345678", 0, 0, 0, "they fill the room"},
         {u"1\r\n123456789\r\n1\r\n1234567890\r\n", 2, 2, 10, "the first and the widest"},
         {u"12345678     \r\n", 0, 0, 0, "blanks at the end are not seen"},
-        {u"1234567\tb\n", 1, 1, 9, "a tab leads behind the room"},
+        {u"1234567\tb\n", 1, 1, 9, "a tab leads past the room"},
         {u"a\t\n", 0, 0, 0, "a tab at the end is not seen"},
         {u"測測測測\n測測測測1", 1, 2, 9, "wide characters take two cells"},
         {u"1234567e\u0301\n", 0, 0, 0, "a mark takes none"},

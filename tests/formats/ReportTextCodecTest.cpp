@@ -36,7 +36,7 @@ QByteArray encoded(ReportTextEncoder &encoder, QStringView piece, bool last)
     const std::size_t size = encoder.encode(piece, bytes.data(), last);
     EXPECT_LE(size, bound);
     for (std::size_t i = bound; i < bytes.size(); ++i) {
-        EXPECT_EQ(bytes[i], '\x55') << "written behind the room for the piece";
+        EXPECT_EQ(bytes[i], '\x55') << "written past the room for the piece";
     }
     return QByteArray(bytes.data(), static_cast<qsizetype>(size));
 }
@@ -108,7 +108,7 @@ TEST(ReportTextCodec, AReportFileIsMarkedUtf8WithEveryLineFeedAsCrLf)
         {u"\xDE00", "ef bb bf ef bf bd", "a low surrogate alone"},
         {u"\xDE00\xD83D", "ef bb bf ef bf bd ef bf bd", "a pair the wrong way round"},
         {u"\xD83D\xD83D\xDE00", "ef bb bf ef bf bd f0 9f 98 80", "a high surrogate before a pair"},
-        {u"\xD83D\xDE00\xDE00", "ef bb bf f0 9f 98 80 ef bf bd", "a low surrogate behind a pair"},
+        {u"\xD83D\xDE00\xDE00", "ef bb bf f0 9f 98 80 ef bf bd", "a low surrogate after a pair"},
         {u"\xD83D\r\n", "ef bb bf ef bf bd 0d 0d 0a", "a high surrogate before a line end"},
         {u"\xD83D"
          u"A",

@@ -41,7 +41,7 @@ TEST(ReportTextDecoder, ReadsWhatReportFilesHold)
         {"\xEF\xBB\xBF\xEF\xBB\xBF"
          "A",
          QChar(QChar::ByteOrderMark) + QStringLiteral("A"), "a second mark is a character"},
-        {"A\nB\n", QStringLiteral("A\r\nB\r\n"), "a text of somebody else"},
+        {"A\nB\n", QStringLiteral("A\r\nB\r\n"), "a text of another program"},
         {"A\r\nB", QStringLiteral("A\r\nB"), "the same with CR LF"},
         {QByteArray("a\0b\n", 4), QStringLiteral("a") + QChar(0) + QStringLiteral("b\r\n"), "a NUL is a character"},
     };
@@ -52,7 +52,7 @@ TEST(ReportTextDecoder, ReadsWhatReportFilesHold)
     }
 }
 
-TEST(ReportTextDecoder, SaysWhereAFileIsNoUtf8)
+TEST(ReportTextDecoder, SaysWhereAFileIsNotUtf8)
 {
     struct Row
     {
@@ -62,7 +62,7 @@ TEST(ReportTextDecoder, SaysWhereAFileIsNoUtf8)
         const char *reason;
     };
     const Row rows[] = {
-        {"\xFF", 1, 1, "a byte that stands nowhere"},
+        {"\xFF", 1, 1, "a byte that is never used"},
         {"ab\xE9", 1, 3, "Latin-1, cut off by the end"},
         {"ab\n\xC3\xA9x\xE9y\n", 2, 3, "columns are characters"},
         {"\xEF\xBB\xBF"

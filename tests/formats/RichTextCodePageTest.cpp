@@ -30,12 +30,12 @@ TEST(RichTextCodePage, BytesAreReadInTheCodePageOfTheFile)
         {"\\ansicpg949\\'c7\\'d1", u"한", "949"},
         {"\\ansicpg950\\'b4\\'fa", u"測", "950"},
         {"\\ansicpg65001\\'c2\\'b0\\'f0\\'9f\\'98\\'80", u"°😀", "UTF-8"},
-        {"\\ansicpg99999\\'b0\\ansicpg-1\\'b0", u"°°", "code pages that nobody knows"},
+        {"\\ansicpg99999\\'b0\\ansicpg-1\\'b0", u"°°", "code pages that do not exist"},
     };
     expectBodies(rows);
 }
 
-TEST(RichTextCodePage, BytesAsTheyStandAreReadAsEscapedOnes)
+TEST(RichTextCodePage, BareBytesAreReadAsEscapedOnes)
 {
     const Row rows[] = {
         {"1\xB0\x80", u"1°€", "1252"},

@@ -28,10 +28,10 @@ TEST(RichTextError, SaysWhatWasExpectedAndKeepsWhatWasRead)
         {"{\\rt", 1, 1, beginning, u"", "cut off in the first word"},
         {"plain text", 1, 1, beginning, u"", "not rich text"},
         {QByteArray(8, '\0'), 1, 1, beginning, u"", "zeros"},
-        {"{\\rtf", 1, 6, one, u"", "cut off behind the first word"},
+        {"{\\rtf", 1, 6, one, u"", "cut off after the first word"},
         {"{\\rtf1 a\nbc", 2, 3, one, u"abc", "cut off in the text"},
         {"{\\rtf1 a\\par\nb{\\b c", 2, 7, two, u"a|b<b>c", "cut off in a group"},
-        {"{\\rtf1 a\\", 1, 9, one, u"a", "cut off behind a backslash"},
+        {"{\\rtf1 a\\", 1, 9, one, u"a", "cut off after a backslash"},
         {"{\\rtf1 a\\'", 1, 11, one, u"a", "cut off in a byte"},
         {"{\\rtf1 a\\'b", 1, 12, one, u"ab", "cut off in a byte: no byte"},
         {"{\\rtf1 a{\\pict 00{ff", 1, 21, "a closing brace was expected: groups that are still open: 3", u"a",
@@ -40,8 +40,7 @@ TEST(RichTextError, SaysWhatWasExpectedAndKeepsWhatWasRead)
          "one byte of data is missing"},
         {"{\\rtf1 a\\bin99999999999 }", 1, 9, "2147483647 bytes of data were expected after \\bin", u"a",
          "far too many"},
-        {"{\\rtf1 a{\\*\\x \\bin9 }}", 1, 15, "9 bytes of data were expected after \\bin", u"a",
-         "in what is passed over"},
+        {"{\\rtf1 a{\\*\\x \\bin9 }}", 1, 15, "9 bytes of data were expected after \\bin", u"a", "in what is skipped"},
         {"{\\rtf1 \xB0\xB0{", 1, 11, two, u"°°", "columns of a file are bytes"},
     };
     for (const ErrorRow &row : rows) {
@@ -96,7 +95,7 @@ TEST(RichTextError, AFileCutOffAnywhereGivesTheBeginningOfItsText)
     }
 }
 
-TEST(RichTextError, AnythingBehindTheBeginningIsReadOrAnswered)
+TEST(RichTextError, AnythingAfterTheBeginningIsReadOrAnswered)
 {
     QRandomGenerator random(20240305);
     constexpr const char *pieces[] = {
@@ -157,7 +156,7 @@ TEST(RichTextNotes, CountWhatIsNotShown)
         {"\\ansicpg932 a{\\v\\'93\\'fa}", {0, 0, 0, 0, 1, 0}, u"a", "of one character in two bytes"},
         {"a{\\v  \\par}b{\\v}c", {0, 0, 0, 0, 0, 0}, u"abc", "blanks and line ends are nothing that is missed"},
         {"a{\\v{\\xe index}{\\*\\bkmkstart m}{\\pict 00}}", {1, 0, 0, 0, 0, 0}, u"a", "no text is hidden here"},
-        {"a{\\footnote{\\v b}}{\\info{\\v c}}", {0, 0, 1, 0, 0, 0}, u"a", "what is passed over as a whole"},
+        {"a{\\footnote{\\v b}}{\\info{\\v c}}", {0, 0, 1, 0, 0, 0}, u"a", "what is skipped as a whole"},
         {"a\\u-3929?{\\v\\u-3929?}", {0, 0, 0, 0, 1, 1}, u"a\xF0A7", "a private character of no known font"},
     };
     for (const NoteRow &row : rows) {

@@ -27,7 +27,7 @@ TEST(RichTextFormat, ReadsFormatsOfCharacters)
         {"\\up6 a\\up0 b\\dn6 c", u"<super>a<>b<sub>c", "by a distance"},
         {"\\caps a\\caps0\\scaps b", u"<caps>a<scaps>b", "capitals"},
         {"\\fs18 a\\fs19 b\\fs c", u"<9pt>a<9.5pt>b<>c", "half points; without a number the usual size"},
-        {"\\fs0 a\\fs-5 b\\fs99999999999 c", u"ab<1638pt>c", "sizes that are none"},
+        {"\\fs0 a\\fs-5 b\\fs99999999999 c", u"ab<1638pt>c", "sizes that are not valid"},
     };
     expectBodies(rows);
 }

@@ -23,7 +23,7 @@ QString richDocument(const RichTextImage &image)
     return image.document(QStringLiteral("Lucida Console"), 9, Form::RichText);
 }
 
-TEST(RichTextImage, EveryPieceStandsInTheTemplateOfItsStyle)
+TEST(RichTextImage, EveryPieceIsInTheTemplateOfItsStyle)
 {
     struct Row
     {

@@ -20,7 +20,7 @@ TEST(RichTextReader, ReadsTheFormOfAReport)
     EXPECT_EQ(shown("{\\rtf1\\ansi\\ansicpg1252\\deff0\\deflang1033{\\fonttbl{\\f9\\fnil\\fcharset0 Lucida Console;}}"
                     "\\viewkind4\\uc1\\pard\\f1\\fs18 ABC \\par\\viewkind4\\uc1\\pard\\b\\f1\\fs18 X\\b0 \\par}"),
               QStringLiteral("<Lucida Console 9pt>ABC |<Lucida Console 9pt b>X"))
-        << "font 1 is not in the table: the first one is used; the blank behind ABC is text, that behind b0 is not";
+        << "font 1 is not in the table: the first one is used; the blank after ABC is text, that after b0 is not";
 }
 
 TEST(RichTextReader, KnowsRichTextByItsBeginning)
@@ -33,7 +33,7 @@ TEST(RichTextReader, KnowsRichTextByItsBeginning)
     };
     constexpr BeginningRow rows[] = {
         {"{\\rtf1}", true, "the usual one"},
-        {"{\\rtf", true, "nothing behind it"},
+        {"{\\rtf", true, "nothing follows it"},
         {"", false, "nothing"},
         {"{\\rt", false, "cut off"},
         {" {\\rtf1}", false, "a blank before it"},
@@ -51,13 +51,13 @@ TEST(RichTextReader, EndsParagraphs)
     const Row rows[] = {
         {"", u"", "nothing: one empty paragraph"},
         {"A", u"A", "a text without an end of its paragraph"},
-        {"A\\par", u"A", "no empty paragraph behind the last end"},
+        {"A\\par", u"A", "no empty paragraph after the last end"},
         {"A\\par\\par", u"A|", "an empty paragraph with an end of its own is one"},
         {"\\par", u"", "one empty paragraph"},
         {"\\par\\par\\par", u"||", "three empty ones"},
         {"\\par A", u"|A", "an empty one before a text"},
         {"A\\\nB\\\r\nC\\\rD", u"A|B|C|D", "an escaped line end ends the paragraph"},
-        {"A\nB\r\nC", u"ABC", "a line end that is not escaped is none"},
+        {"A\nB\r\nC", u"ABC", "a line end that is not escaped is ignored"},
         {"A\\par\nB", u"A|B", "a line end ends a word"},
         {"A\\par B\\par  C", u"A|B| C", "one blank ends a word, the next is text"},
         {"A\\line B",
@@ -66,9 +66,9 @@ TEST(RichTextReader, EndsParagraphs)
          "a line end within the paragraph"},
         {"A\\'0dB\\u10?C\\u8233?D", u"A|B|C|D", "characters that end paragraphs do"},
         {QByteArray("A\0B\\p\0ar C", 11), u"ABar C", "zero bytes are left out, and end a word"},
-        {"A}B", u"A", "what stands behind the last group is not read"},
+        {"A}B", u"A", "what follows the last group is not read"},
         {"A\\parx B", u"AB", "a word that is not known is left out"},
-        {"A\\par1 B", u"A|B", "a number that nobody needs"},
+        {"A\\par1 B", u"A|B", "a number without a meaning"},
         {"a\tb\\tab c\\\td", u"a\tb\tc\td", "a tab in all its forms"},
     };
     expectBodies(rows);
@@ -109,11 +109,11 @@ TEST(RichTextReader, ReadsUnicodeCharactersAndLeavesOutWhatStandsForThem)
         {"\\u-10179?\\u-8704?", u"😀", "both halves, signed"},
         {"\\u55357\\u56832?x", u"😀x", "a Unicode character never stands for another"},
         {"\\u128512?", u"😀", "in one number"},
-        {"\\u1114112?", u"\xFFFD", "behind the last character"},
+        {"\\u1114112?", u"\xFFFD", "beyond the last character"},
         {"\\u-99999?\\u2147483648?", u"\xFFFD\xFFFD", "out of range"},
         {"a\\u0?b", u"ab", "a zero shows nothing"},
         {"\\u64976?\\u64977?", u"\xFFFD\xFFFD", "no characters, but a document's own marks"},
-        {"\\uc-1\\u8364 x", u"€x", "a count below zero is none"},
+        {"\\uc-1\\u8364 x", u"€x", "a count below zero is ignored"},
         {"\\uc99999999999\\u8364 abc{d}", u"€d", "a huge count"},
         {"\\u?x", u"x", "without a number"},
     };

@@ -131,7 +131,7 @@ TEST(RichTextRoundTrip, EveryFormatOfParagraphs)
     expectSame(all, "all, with empty paragraphs");
 }
 
-TEST(RichTextRoundTrip, APageEndBehindAParagraphIsOneBeforeTheNext)
+TEST(RichTextRoundTrip, APageEndAfterAParagraphIsOneBeforeTheNext)
 {
     QTextDocument document;
     QTextCursor cursor(&document);

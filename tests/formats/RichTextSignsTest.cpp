@@ -41,13 +41,13 @@ TEST(RichTextSigns, SignsOfKnownFontsBecomeCharacters)
         {"\\f2\\'ff\\'7f", u"\xF0FF\xF07F", 2, "what the font has no character for"},
         {"\\f1\\'f0\\'80", u"\xF0F0\xF080", 2, "what the font has no character for"},
         {"\\f3 a b\\'fc\\u-3844?\\'b7", u"a b\xF0FC\xF0FC•", 4,
-         "a font that is not known: letters stay, blanks are no signs"},
+         "a font that is not known: letters stay, blanks are not signs"},
         {"\\f2\\'21\\'4a\\'20", u"🖉☺ ", 0, "letters by their bytes"},
         {"\\f6\\'52", u"R", 1, "a name that only begins as a known one"},
         {"\\f4 a\\'b7", u"α•", 0, "without a character set, by the name in any case"},
         {"\\f5 a\\'b7\\u-3929?", u"a·♣", 0, "with one of letters, bytes are letters"},
-        {"\\u-3929?\\u-4064?\\u-4096?", u"\xF0A7\xF020\xF000", 3, "in a font of letters nobody can tell"},
-        {"\\f1\\u57344?\\u61696?", u"\xE000\xF100", 0, "other private characters are no signs"},
+        {"\\u-3929?\\u-4064?\\u-4096?", u"\xF0A7\xF020\xF000", 3, "in a font of letters there is no telling"},
+        {"\\f1\\u57344?\\u61696?", u"\xE000\xF100", 0, "other private characters are not signs"},
     };
     for (const Row &row : rows) {
         const QByteArray bytes = fonts + row.bytes + '}';

@@ -66,7 +66,7 @@ TEST(RichTextWriter, WritesCharactersInSevenBits)
     const TextRow rows[] = {
         {QStringLiteral("a{b}c\\d"), "a\\{b\\}c\\\\d", "what has a meaning is escaped"},
         {QStringLiteral("a\tb"), "a\\tab b", "a tab"},
-        {QStringLiteral("a\u2028 b"), "a\\line  b", "a line end in the paragraph; the blank behind it is text"},
+        {QStringLiteral("a\u2028 b"), "a\\line  b", "a line end in the paragraph; the blank after it is text"},
         {QStringLiteral("\u00A0°ÿ\u00AD"), "\\'a0\\'b0\\'ff\\'ad", "what code page 1252 has at its own place"},
         {QStringView(control, 8).toString(), "a\\'01\\'1f\\'7f\\u128?\\u159?b",
          "control characters; a zero is left out"},

@@ -37,7 +37,7 @@ TEST(SingleByteText, HasOneByteACharacterAndAnEscapeForWiderOnes)
         {u"A", "A", "A", "ASCII"},
         {u"\u0080é\u00FF", "\x80\xE9\xFF", "\x80\xE9\xFF", "up to U+00FF the byte of the same value"},
         {u"\u0100", "\\u256?", "?", "the first character that has no byte"},
-        {u"a∞b", "a\\u8734?b", "a?b", "nothing behind it is lost"},
+        {u"a∞b", "a\\u8734?b", "a?b", "nothing that follows it is lost"},
         {u"測量", "\\u28204?\\u-28209?", "??", "a number beyond 32767 is written as the negative one"},
         {u"\u7FFF\u8000\uFFFF", "\\u32767?\\u-32768?\\u-1?", "???", "the ends of the signed numbers"},
         {u"a\xD83D\xDE00"
@@ -50,9 +50,9 @@ TEST(SingleByteText, HasOneByteACharacterAndAnEscapeForWiderOnes)
          "\\u-8704?\\u-10179?\xE9", "??\xE9", "the halves in the wrong order are two characters"},
         {u"\xD83D\n", "\\u-10179?\r\n", "?\r\n", "half a pair before a line end"},
         {u"a\nb", "a\r\nb", "a\r\nb", "LF becomes CR LF"},
-        {u"a\r\nb\r\n", "a\r\r\nb\r\r\n", "a\r\r\nb\r\r\n", "a CR that stands before it stays"},
+        {u"a\r\nb\r\n", "a\r\r\nb\r\r\n", "a\r\r\nb\r\r\n", "a CR before it stays"},
         {u"\n\n\r", "\r\n\r\n\r", "\r\n\r\n\r", "line ends alone; a lone CR stays"},
-        {u"\\{}\t", "\\{}\t", "\\{}\t", "markup and control characters are nobody's business here"},
+        {u"\\{}\t", "\\{}\t", "\\{}\t", "markup and control characters are left alone here"},
         {QStringView(u"a\0b", 3), std::string("a\0b", 3), std::string("a\0b", 3), "a zero is a character"},
         {u"\uFEFF"
          u"a",
@@ -99,7 +99,7 @@ TEST(SingleByteText, AFailedWriteEndsIt)
         device.limit = row.limit;
         EXPECT_EQ(writeSingleByteText(device, QString(row.length, u'x'), WideCharacters::QuestionMark), row.expected)
             << row.reason;
-        EXPECT_LE(device.taken.size(), std::max<qint64>(row.limit, 0)) << row.reason << ": nothing behind the gap";
+        EXPECT_LE(device.taken.size(), std::max<qint64>(row.limit, 0)) << row.reason << ": nothing after the gap";
     }
 }
 

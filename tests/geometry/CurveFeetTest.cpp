@@ -117,7 +117,7 @@ TEST(CurveFeet, AllFeetOfTransitionsAreFound)
                 for (const CurveFoot &foot : found.feet) {
                     const CurvePlace place = curve.at(foot.length);
                     EXPECT_LT(distanceBetween(pointBeside(place.point, place.bearing, foot.offset), point), 1e-6)
-                        << "seed " << runs.seed() << ": at " << foot.length << " is no foot";
+                        << "seed " << runs.seed() << ": at " << foot.length << " is not a foot";
                 }
             }
         }

@@ -148,7 +148,7 @@ TEST(PlaneCurve, AllItsCurvaturesLieBetweenThoseOfAStretch)
                     EXPECT_LE(curve.at(at).curvature, most + 1e-16) << static_cast<int>(form) << " at " << at;
                 }
                 EXPECT_LT(most - least, 0.003)
-                    << static_cast<int>(form) << ": limits far from the curvatures help nobody";
+                    << static_cast<int>(form) << ": limits far from the curvatures are of no use";
             }
         }
     }

@@ -135,7 +135,7 @@ TEST(VerticalProfile, HighAndLowPointsAreWhereTheGradeChangesItsSign)
         {{{0, 0}, circle(100, 2, 1000), {300, -2}}, {100}, {true}, "a circle of equal grades"},
         {{{0, 0}, {100, 2}, {200, 2}, {300, 4}}, {}, {}, "level, but up before and after"},
         {{{0, 0}, {100, 2}, {200, 2}, {300, 0}}, {}, {}, "a level top has no one place"},
-        {{{0, 0}, {100, 2}}, {}, {}, "the ends are no turning points"},
+        {{{0, 0}, {100, 2}}, {}, {}, "the ends are not turning points"},
     };
     for (const Row &row : rows) {
         const VerticalProfile profile = profileOf(row.points);

@@ -153,13 +153,13 @@ TEST(EditorLauncher, TheProgramGoesOnByItself)
                                                  "done\n");
     const QTemporaryDir folder;
     kareport::launchEditor(editor.program, folder.filePath(QStringLiteral("a.rep")), folder.path());
-    EXPECT_FALSE(editor.isDone()) << "nobody waits for it";
+    EXPECT_FALSE(editor.isDone()) << "it is not waited for";
     putFile(editor.at(QStringLiteral("go")), "");
     ASSERT_TRUE(editor.waitTillDone());
-    EXPECT_NE(editor.note("parent"), std::to_string(QCoreApplication::applicationPid())) << "it is no child";
+    EXPECT_NE(editor.note("parent"), std::to_string(QCoreApplication::applicationPid())) << "it is not a child";
 }
 
-TEST(EditorLauncher, WhatCannotBeStartedIsPassedOver)
+TEST(EditorLauncher, WhatCannotBeStartedIsSkipped)
 {
     const StandIn editor;
     const QTemporaryDir folder;
@@ -172,7 +172,7 @@ TEST(EditorLauncher, WhatCannotBeStartedIsPassedOver)
         kareport::launchEditor(program, file, folder.path());
     }
     kareport::launchEditor(editor.program, file, folder.filePath(QStringLiteral("missing")));
-    EXPECT_EQ(messages.texts, QStringList()) << "nobody is told";
+    EXPECT_EQ(messages.texts, QStringList()) << "nothing is said";
     kareport::launchEditor(editor.program, plainFile, folder.path());
     ASSERT_TRUE(editor.waitTillDone()) << "and the next one is started";
     EXPECT_EQ(editor.note("file"), plainFile.toStdString());

@@ -35,7 +35,7 @@ TEST(Folders, AreAbsoluteWithoutASetting)
 {
     EXPECT_TRUE(QDir::isAbsolutePath(GetLibraryDir(false)));
     EXPECT_TRUE(QDir(GetStartPathName()).exists());
-    EXPECT_NE(GetStartPathName(), QDir::currentPath()) << "the program stands in a temporary folder since its start";
+    EXPECT_NE(GetStartPathName(), QDir::currentPath()) << "the program is in a temporary folder since its start";
     EXPECT_TRUE(QDir::isAbsolutePath(GetTempDir(false)));
 }
 
@@ -140,7 +140,7 @@ TEST_F(LastOpenFolder, IsKeptAsAFullPath)
         const char *reason;
     };
     const Row rows[] = {
-        {QStringLiteral("a.rep"), here, "a name alone stands in the current folder"},
+        {QStringLiteral("a.rep"), here, "a name alone is in the current folder"},
         {QStringLiteral("測量 é.rep"), here, "characters beyond ASCII"},
         {QStringLiteral("/a.rep"), QStringLiteral("/"), "the root"},
         {QDir::tempPath() + QStringLiteral("/a"), QDir::tempPath(), "a file without an extension"},
@@ -166,7 +166,7 @@ TEST_F(LastOpenFolder, ThatIsGoneIsNotOffered)
     ASSERT_TRUE(QDir().rmdir(path));
     QFile file(path);
     ASSERT_TRUE(file.open(QIODevice::WriteOnly));
-    EXPECT_EQ(GetInitialOpenDir(key), QString()) << "a file of its name is no folder";
+    EXPECT_EQ(GetInitialOpenDir(key), QString()) << "a file of its name is not a folder";
     ASSERT_TRUE(file.remove());
 }
 

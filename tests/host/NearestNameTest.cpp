@@ -8,7 +8,7 @@ namespace
 using kareport::didYouMean;
 using kareport::nearestName;
 
-TEST(NearestName, FindsWhatSomebodyMayHaveMeant)
+TEST(NearestName, FindsWhatWasProbablyMeant)
 {
     const QStringList known = {"Number", "Northing", "Easting", "Elevation", "Description", "Dx", "Dy"};
     struct Row
@@ -28,7 +28,7 @@ TEST(NearestName, FindsWhatSomebodyMayHaveMeant)
         {"Descr", "Description", "its beginning"},
         {"DX1", "Dx", "a letter too many after a short name"},
         {"Dz", "Dx", "of names equally near, the first"},
-        {"El", "", "a beginning of two letters is none"},
+        {"El", "", "a beginning of two letters is too short"},
         {"Zzz", "", "nothing is near"},
         {"", "", "nothing"},
         {"Q", "", "all letters would be wrong"},

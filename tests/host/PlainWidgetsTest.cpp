@@ -121,7 +121,7 @@ TEST(PlainWidgets, ToolTipsAndMenuEntriesShowTextsToTheLetter)
         {QStringLiteral("/road/a.rep"), QStringLiteral("/road/a.rep"), QStringLiteral("/road/a.rep"), "a plain name"},
         {QStringLiteral("R&D"), QStringLiteral("R&D"), QStringLiteral("R&&D"), "an ampersand marks no key"},
         {QStringLiteral("a\tb\nc"), QStringLiteral("a\tb\nc"), QStringLiteral("a b c"),
-         "what follows a tab would stand where the keys do"},
+         "what follows a tab would be shown where the keys are"},
         {QStringLiteral("<b>a</b>"), QStringLiteral("<qt>&lt;b&gt;a&lt;/b&gt;</qt>"), QStringLiteral("<b>a</b>"),
          "tool tips take it for HTML, menus do not"},
         {QStringLiteral("a <b"), QStringLiteral("a <b"), QStringLiteral("a <b"), "no HTML"},

@@ -84,7 +84,7 @@ private:
     QString text_;
 };
 
-TEST(Preferences, AFontSizeThatIsNoneIsTheUsualOne)
+TEST(Preferences, AFontSizeThatIsNotValidIsTheUsualOne)
 {
     const EmptyProfile profile;
     struct Row

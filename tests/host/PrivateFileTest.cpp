@@ -29,7 +29,7 @@ TEST_F(PrivateFile, IsNewAndTheUsersOwn)
     EXPECT_EQ(file.write("text"), 4);
     file.close();
     EXPECT_EQ(contentOf(at("a.rep")), "text");
-    EXPECT_EQ(QFile::permissions(at("a.rep")) & others, QFile::Permissions()) << "nobody else reads it";
+    EXPECT_EQ(QFile::permissions(at("a.rep")) & others, QFile::Permissions()) << "no other user reads it";
     EXPECT_TRUE(QFile::permissions(at("a.rep")) & QFile::ReadOwner);
     EXPECT_TRUE(QFile::permissions(at("a.rep")) & QFile::WriteOwner);
 }

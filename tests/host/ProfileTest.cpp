@@ -208,7 +208,7 @@ TEST(Profile, WithoutAStoreTheEntriesLiveInTheUsualSettings)
 {
     const ProfileRestored restored;
     const RedirectedSettings settings;
-    ASSERT_TRUE(RedirectedSettings::applicationFile().startsWith(settings.folder())) << "nobody's own file";
+    ASSERT_TRUE(RedirectedSettings::applicationFile().startsWith(settings.folder())) << "not a user's own file";
     setProfileStore(nullptr);
     WriteProfileString(QString(), QStringLiteral("Entry"), QStringLiteral("kept"));
     setProfileStore(makeMemoryProfile());

@@ -50,7 +50,7 @@ TEST(RememberedView, GetsItsPlaceBack)
     document.SetAutoDelete(false);
     auto *pane = new ToppedPane(log);
     UView *view = addRecordingView(*pane, document);
-    EXPECT_FALSE(RememberedView(view).bringToTop()) << "nobody would see it";
+    EXPECT_FALSE(RememberedView(view).bringToTop()) << "it would not be seen";
     pane->ShowPane(true);
     RememberedView(view).reactivate();
     EXPECT_EQ(pane->tops, 1) << "also without a frame";

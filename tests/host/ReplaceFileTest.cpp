@@ -110,9 +110,9 @@ TEST(ReplaceFile, ATargetThatCannotBeAFileIsRefusedWithTheReason)
         const char *reason;
     };
     const Row rows[] = {
-        {QStringLiteral("folder"), "a folder stands there"},
+        {QStringLiteral("folder"), "a folder has the name"},
         {QStringLiteral("missing/report.rep"), "the folder does not exist"},
-        {QStringLiteral("report.rep/report.rep"), "a file is no folder"},
+        {QStringLiteral("report.rep/report.rep"), "a file is not a folder"},
     };
     for (const Row &row : rows) {
         QString error;

@@ -99,7 +99,7 @@ TEST(TextBuffer, InsertsAtAnyPosition)
     constexpr Row rows[] = {
         {0, 2, u"--abc", "at the front"},
         {1, 2, u"a--bc", "inside"},
-        {1, 10, u"a----------bc", "more than stands behind"},
+        {1, 10, u"a----------bc", "more than there is after it"},
         {3, 2, u"abc--", "at the end"},
         {1, 0, u"abc", "nothing"},
     };
@@ -114,7 +114,7 @@ TEST(TextBuffer, InsertsAtAnyPosition)
     EXPECT_EQ(textOf(empty), QStringLiteral("xxx")) << "into nothing";
 }
 
-TEST(TextBuffer, PadsOnlyWhatStandsFromThePosition)
+TEST(TextBuffer, PadsOnlyWhatFollowsThePosition)
 {
     struct Row
     {
@@ -126,16 +126,16 @@ TEST(TextBuffer, PadsOnlyWhatStandsFromThePosition)
     };
     constexpr Row rows[] = {
         {u"abc", 0, 5, u"  abc", "before"},
-        {u"abc", 0, -5, u"abc  ", "behind"},
+        {u"abc", 0, -5, u"abc  ", "blanks after"},
         {u"abc", 0, 3, u"abc", "as long as wide"},
-        {u"abc", 0, -3, u"abc", "as long as wide, behind"},
+        {u"abc", 0, -3, u"abc", "as long as wide, blanks after"},
         {u"abc", 0, 2, u"abc", "never cut"},
-        {u"abc", 0, -2, u"abc", "never cut, behind"},
+        {u"abc", 0, -2, u"abc", "never cut, blanks after"},
         {u"abc", 0, 0, u"abc", "no width"},
-        {u"abc", 1, 4, u"a  bc", "what stands before does not count"},
-        {u"abc", 1, -4, u"abc  ", "what stands before does not count, behind"},
+        {u"abc", 1, 4, u"a  bc", "what is before it does not count"},
+        {u"abc", 1, -4, u"abc  ", "what is before it does not count, blanks after"},
         {u"abc", 3, 2, u"abc  ", "an empty part"},
-        {u"abc", 3, -2, u"abc  ", "an empty part, behind"},
+        {u"abc", 3, -2, u"abc  ", "an empty part, blanks after"},
         {u"", 0, 2, u"  ", "an empty text"},
         {u"😀", 0, 3, u" 😀", "a surrogate pair is two characters wide"},
     };
@@ -147,7 +147,7 @@ TEST(TextBuffer, PadsOnlyWhatStandsFromThePosition)
     }
 }
 
-TEST(TextBuffer, TrimsOnlyWhatStandsFromThePosition)
+TEST(TextBuffer, TrimsOnlyWhatFollowsThePosition)
 {
     struct Row
     {
@@ -162,8 +162,8 @@ TEST(TextBuffer, TrimsOnlyWhatStandsFromThePosition)
         {u" \t\r\n a b \t\r\n", 0, u"a b", "every kind of white space; not inside"},
         {u"    ", 0, u"", "white space only"},
         {u"", 0, u"", "an empty text"},
-        {u"x   abc  ", 2, u"x abc", "what stands before stays"},
-        {u"x    ", 1, u"x", "white space only, behind something"},
+        {u"x   abc  ", 2, u"x abc", "what is before it stays"},
+        {u"x    ", 1, u"x", "white space only, after something"},
         {u"x ", 2, u"x ", "an empty part"},
         {u"\u00A0\u3000測\u2003", 0, u"測", "white space beyond ASCII"},
     };

@@ -25,7 +25,7 @@ constexpr FoldRow foldRows[] = {
     {u"Points", u"Points ", false, "a blank counts"},
     {u"Point", u"Points", false, "the begin of a name is not the name"},
     {u"a_1", u"A_1", true, "what has no case stays"},
-    {u"[", u"{", false, "characters 32 apart that are no letters"},
+    {u"[", u"{", false, "characters 32 apart that are not letters"},
     {u"é", u"É", true, "accented letters"},
     {u"жук", u"ЖУК", true, "Cyrillic"},
     {u"σ", u"ς", true, "the final sigma is a sigma"},

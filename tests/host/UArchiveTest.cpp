@@ -63,7 +63,7 @@ TEST(UArchive, AFailedWriteIsRemembered)
         device.limit = 100;
         archive.Write("third ");
         EXPECT_FALSE(archive.IsGood()) << row.reason << ": for good";
-        EXPECT_EQ(device.taken, row.taken.toByteArray()) << row.reason << ": nothing is written behind the gap";
+        EXPECT_EQ(device.taken, row.taken.toByteArray()) << row.reason << ": nothing is written after the gap";
     }
 }
 

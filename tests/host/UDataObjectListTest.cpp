@@ -52,8 +52,8 @@ TEST(UDataObjectList, GivesItsObjectsByIndexFromZero)
     UDataObject &second = list.Add();
     EXPECT_EQ(list.GetAt(0), &first);
     EXPECT_EQ(list.GetAt(1), &second);
-    EXPECT_EQ(list.GetAt(2), nullptr) << "behind the last one";
-    EXPECT_EQ(list.GetAt(std::numeric_limits<std::size_t>::max()), nullptr) << "far behind the last one";
+    EXPECT_EQ(list.GetAt(2), nullptr) << "after the last one";
+    EXPECT_EQ(list.GetAt(std::numeric_limits<std::size_t>::max()), nullptr) << "far after the last one";
     EXPECT_EQ(second.Find(key), nullptr) << "a new object is empty";
 }
 
@@ -130,7 +130,8 @@ TEST(UDataObjectList, SortOrdersValuesOfEveryKind)
         {qint32{2147483647}, 2147483646.5, 1, "the largest 32-bit number is held exactly"},
         {std::numeric_limits<double>::quiet_NaN(), -infinite, -1, "not a number before all other numbers"},
         {std::numeric_limits<double>::quiet_NaN(), missing, 1, "not a number is not missing"},
-        {std::numeric_limits<double>::quiet_NaN(), -std::numeric_limits<double>::quiet_NaN(), 0, "two that are none"},
+        {std::numeric_limits<double>::quiet_NaN(), -std::numeric_limits<double>::quiet_NaN(), 0,
+         "two that are not numbers"},
         {infinite, QString(), -1, "any number before a text"},
         {1e9, QStringLiteral("1"), -1, "a number before a text of digits"},
         {1e9, point(u"1"), -1, "a number before a point number"},
@@ -176,7 +177,7 @@ TEST(UDataObjectList, SortOrdersPointNumbersNaturally)
         {u"12A", u"12B", -1, "the second run decides"},
         {u"12a", u"12B", -1, "case does not matter"},
         {u"12a", u"12A", 0, "the same but for case"},
-        {u"BM-3", u"bm-20", -1, "digits behind other characters"},
+        {u"BM-3", u"bm-20", -1, "digits after other characters"},
         {u"A2B10", u"A2B9", 1, "the last run decides"},
         {u"A1B", u"A01B", -1, "the shorter run first when the numbers are the same"},
         {u"7", u"007", -1, "the shorter run first when the numbers are the same"},
@@ -193,12 +194,12 @@ TEST(UDataObjectList, SortOrdersPointNumbersNaturally)
         {u"A1", u"AB", -1, "the runs are A and AB, and A begins AB"},
         {u"A1", u"A-", -1, "the runs are A and A-, and A begins A-"},
         {u"A", u"A1", -1, "fewer runs first"},
-        {u"-5", u"5", 1, "a sign is another run, behind a digit run"},
+        {u"-5", u"5", 1, "a sign is another run, after a digit run"},
         {u"-5", u"-10", -1, "and is not part of the number"},
         {u"1.5", u"1.10", -1, "nor is a point"},
         {u"٣", u"9", 1, "only ASCII digits are digits"},
         {u"٣", u"a", 1, "and others compare as characters"},
-        {u"９", u"10", 1, "a full-width digit is no digit"},
+        {u"９", u"10", 1, "a full-width digit is not a digit"},
         {u"测9", u"测10", -1, "characters beyond ASCII in another run"},
         {u"😀9", u"😀10", -1, "a surrogate pair in another run"},
     };

@@ -113,7 +113,7 @@ TEST(UDocTemplate, OpensIntoAPaneThatIsThere)
     ASSERT_EQ(pane->GetViews().size(), 2U);
     EXPECT_EQ(viewOf(pane, 1)->GetDocument(), document);
     EXPECT_EQ(viewOf(pane, 1)->updates.size(), 1U);
-    EXPECT_TRUE(otherView->updates.empty()) << "views of other documents are none of its business";
+    EXPECT_TRUE(otherView->updates.empty()) << "views of other documents are not touched";
     EXPECT_TRUE(pane->IsVisible());
 }
 

@@ -54,7 +54,7 @@ TEST(UDocumentFrameCounts, HiddenPanesDoNotCount)
     shown.pane(1).ShowPane(false);
     shown.count();
     EXPECT_EQ(shown.pane(0).GetWindowNumber(), 1);
-    EXPECT_EQ(shown.pane(2).GetWindowNumber(), 2) << "the hidden one is passed over";
+    EXPECT_EQ(shown.pane(2).GetWindowNumber(), 2) << "the hidden one is skipped";
     shown.pane(0).ShowPane(false);
     shown.count();
     EXPECT_EQ(shown.pane(2).GetWindowNumber(), 0) << "the only one that is seen";
@@ -98,7 +98,7 @@ TEST(UDocumentFrameCounts, SeveralViewsInOnePaneCountOnce)
     EXPECT_EQ(shown.count(), QStringLiteral("T"));
     openRecordingPane(shown.log, shown.document)->SetWindowTextW(QStringLiteral("U"));
     addRecordingView(shown.pane(0), shown.document);
-    EXPECT_EQ(shown.count(), QStringLiteral("T:1 U:2")) << "views of the first pane before and behind the second";
+    EXPECT_EQ(shown.count(), QStringLiteral("T:1 U:2")) << "views of the first pane before and after the second";
 }
 
 TEST(UDocumentFrameCounts, CountInTheOrderOfTheViews)

@@ -176,9 +176,9 @@ TEST(UDocumentSave, AnImpossibleTargetKeepsTheModifiedFlagAndThePath)
         const char *reason;
     };
     constexpr Row rows[] = {
-        {u"folder", "a folder stands there"},
+        {u"folder", "a folder has the name"},
         {u"missing/new.txt", "the folder does not exist"},
-        {u"own.txt/new.txt", "a file is no folder"},
+        {u"own.txt/new.txt", "a file is not a folder"},
     };
     for (const Row &row : rows) {
         EXPECT_FALSE(changed.document.DoSave(changed.folder.filePath(row.name.toString()), true)) << row.reason;

@@ -39,7 +39,7 @@ TEST(UDocument, ShowsItsTitleOnEveryPane)
     EXPECT_EQ(first->GetWindowTextW(), QStringLiteral("Traverse 測量"));
     EXPECT_EQ(second->GetWindowTextW(), QStringLiteral("Traverse 測量")) << "a hidden pane as well";
     EXPECT_EQ(otherPane->GetWindowTextW(), QString()) << "another document's pane stays";
-    EXPECT_EQ(document.GetPathName(), QString()) << "a title is no file";
+    EXPECT_EQ(document.GetPathName(), QString()) << "a title is not a file";
 }
 
 TEST(UDocument, TakesItsTitleFromItsFile)
@@ -136,7 +136,7 @@ TEST(UDocument, AViewMayCloseAnotherOneWhileItIsUpdated)
     view->closes = {closed};
     document.UpdateAllViews(nullptr);
     EXPECT_EQ(log.panes.size(), 2U);
-    EXPECT_EQ(last->updates.size(), 1U) << "those behind it are updated";
+    EXPECT_EQ(last->updates.size(), 1U) << "those after it are updated";
     EXPECT_EQ(document.GetViews().size(), 2U);
 }
 

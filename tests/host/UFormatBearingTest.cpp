@@ -85,7 +85,7 @@ TEST(UFormatBearing, WholeCircleInDms)
         {at(123, 45, 56), u"123°45'56\"", "three digits"},
         {at(359, 59, 59), u"359°59'59\"", "the last second"},
         {at(359, 59, 59.4), u"359°59'59\"", "rounds down"},
-        {at(359, 59, 59.6), u"000°00'00\"", "a whole circle is none"},
+        {at(359, 59, 59.6), u"000°00'00\"", "a whole circle is zero"},
         {at(29, 59, 59.9), u"030°00'00\"", "never 60 seconds, nor 60 minutes"},
         {at(29, 58, 59.9), u"029°59'00\"", "never 60 seconds"},
         {at(30), u"030°00'00\"", "a double a little below 30 degrees"},
@@ -95,7 +95,7 @@ TEST(UFormatBearing, WholeCircleInDms)
         {at(-5), u"355°00'00\"", "negative"},
         {at(-365), u"355°00'00\"", "negative, more than a circle"},
         {-2 * pi, u"000°00'00\"", "one circle back"},
-        {-1e-20, u"000°00'00\"", "a trace below zero becomes a whole circle, which is none"},
+        {-1e-20, u"000°00'00\"", "a trace below zero becomes a whole circle, which is zero"},
         {at(0, 0, -0.4), u"000°00'00\"", "rounds up to a whole circle"},
         {at(0, 0, -0.6), u"359°59'59\"", "does not"},
     };
@@ -120,7 +120,7 @@ TEST(UFormatBearing, QuadrantsInDms)
         {at(270, 0, 1), u"N 89°59'59\" W", "just past west"},
         {at(314, 53, 53), u"N 45°06'07\" W", "fourth quadrant"},
         {at(359, 59, 59), u"N 00°00'01\" W", "just before north"},
-        {at(359, 59, 59.6), u"N 00°00'00\" E", "a whole circle is none"},
+        {at(359, 59, 59.6), u"N 00°00'00\" E", "a whole circle is zero"},
         {at(-45), u"N 45°00'00\" W", "negative"},
         {at(405), u"N 45°00'00\" E", "more than a circle"},
         {at(30, 59, 59.9), u"N 31°00'00\" E", "never 60 seconds"},
@@ -134,7 +134,7 @@ TEST(UFormatBearing, CountedFromSouth)
     constexpr Row circles[] = {
         {0, u"180°00'00\"", "half a circle is added"},
         {at(90), u"270°00'00\"", "east"},
-        {pi, u"000°00'00\"", "south: a whole circle is none"},
+        {pi, u"000°00'00\"", "south: a whole circle is zero"},
         {at(270), u"090°00'00\"", "west"},
         {at(-90), u"090°00'00\"", "negative"},
         {-pi, u"000°00'00\"", "half a circle back"},
@@ -179,7 +179,7 @@ TEST(UFormatBearing, DegreesAndGon)
     constexpr Row degrees[] = {
         {at(5.25), u"005.25°", "padded to three digits"},
         {at(359.994), u"359.99°", "rounds down"},
-        {at(359.996), u"000.00°", "a whole circle is none"},
+        {at(359.996), u"000.00°", "a whole circle is zero"},
         {at(-90), u"270.00°", "negative"},
     };
     expectBearings(UFormatBearing(deg, circle, 2, 1, 0), degrees);
@@ -187,7 +187,7 @@ TEST(UFormatBearing, DegreesAndGon)
         {at(5.25), u"N 05.25° E", "padded to two digits"}, {pi / 2, u"N 90.00° E", "east"},
         {at(90.01), u"S 89.99° E", "just past east"},      {pi, u"S 00.00° E", "south"},
         {at(180.01), u"S 00.01° W", "just past south"},    {3 * pi / 2, u"S 90.00° W", "west"},
-        {at(270.01), u"N 89.99° W", "just past west"},     {at(359.996), u"N 00.00° E", "a whole circle is none"},
+        {at(270.01), u"N 89.99° W", "just past west"},     {at(359.996), u"N 00.00° E", "a whole circle is zero"},
     };
     expectBearings(UFormatBearing(deg, quadrant, 2, 1, 0), degreeQuadrants);
     constexpr Row gons[] = {
@@ -207,7 +207,7 @@ TEST(UFormatBearing, DegreesAndGon)
         {atGon(201), u"S 001g W", "just past south"},
         {3 * pi / 2, u"S 100g W", "west"},
         {atGon(301), u"N 099g W", "just past west"},
-        {atGon(399.6), u"N 000g E", "a whole circle is none"},
+        {atGon(399.6), u"N 000g E", "a whole circle is zero"},
     };
     expectBearings(UFormatBearing(gon, quadrant, 0, 1, 0), gonQuadrants);
 }
@@ -268,7 +268,7 @@ TEST(UFormatBearing, DecimalsOfSecondsNeverShow60)
         {at(10, 0, 0.001), u"010°00'00.001\"", "leading zeros of the decimals"},
         {at(9, 59, 59.9996), u"010°00'00.000\"", "carries into the degrees"},
         {at(9, 59, 59.9994), u"009°59'59.999\"", "rounds down"},
-        {at(359, 59, 59.9996), u"000°00'00.000\"", "a whole circle is none"},
+        {at(359, 59, 59.9996), u"000°00'00.000\"", "a whole circle is zero"},
     };
     expectBearings(UFormatBearing(dms, circle, 3, 1, 0), rows);
     constexpr Row nine[] = {

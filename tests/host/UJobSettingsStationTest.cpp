@@ -172,7 +172,7 @@ TEST(UJobSettingsStation, BlankZeroAndTrimmedZeros)
         {.value = 0, .plain = true, .blankZero = true, .expected = u"", .reason = "zero, plain"},
         {.value = -0.0004, .blankZero = true, .showSign = true, .expected = u"", .reason = "zero as it is shown"},
         {.value = 0.0006, .blankZero = true, .expected = u"0+000.001", .reason = "not zero as it is shown"},
-        {.value = 1000, .blankZero = true, .expected = u"1+000.000", .reason = "zeros behind another digit"},
+        {.value = 1000, .blankZero = true, .expected = u"1+000.000", .reason = "zeros after another digit"},
         {.value = 5.5, .trimZeros = true, .expected = u"0+005.5", .reason = "zeros of the fraction go"},
         {.value = 5.05, .trimZeros = true, .expected = u"0+005.05", .reason = "zeros inside stay"},
         {.value = 5, .trimZeros = true, .expected = u"0+005", .reason = "the point goes with the last of them"},
@@ -203,7 +203,7 @@ TEST(UJobSettingsStation, WithItsUnit)
          .expected = u"3+937.000 ft",
          .reason = "survey feet"},
         {.value = 5500, .unit = LengthUnit::Kilometre, .withUnit = true, .expected = u"0+005.500 km", .reason = "km"},
-        {.value = 0, .withUnit = true, .blankZero = true, .expected = u"", .reason = "no unit behind nothing"},
+        {.value = 0, .withUnit = true, .blankZero = true, .expected = u"", .reason = "no unit after an empty text"},
     };
     expectStations(rows);
 }
@@ -212,7 +212,7 @@ TEST(UJobSettingsStation, PaddedToItsWidth)
 {
     constexpr Row rows[] = {
         {.value = 5.5, .width = 12, .alignRight = true, .expected = u"   0+005.500", .reason = "blanks before"},
-        {.value = 5.5, .width = 12, .expected = u"0+005.500   ", .reason = "blanks behind"},
+        {.value = 5.5, .width = 12, .expected = u"0+005.500   ", .reason = "blanks after it"},
         {.value = 5.5, .width = 9, .alignRight = true, .expected = u"0+005.500", .reason = "as long as wide"},
         {.value = 5.5, .width = 4, .expected = u"0+005.500", .reason = "never cut"},
         {.value = 5.5, .width = 0, .alignRight = true, .expected = u"0+005.500", .reason = "none"},
@@ -223,7 +223,7 @@ TEST(UJobSettingsStation, PaddedToItsWidth)
          .alignRight = true,
          .showSign = true,
          .expected = u"  -0+005.500",
-         .reason = "the sign counts and stands beside the digits"},
+         .reason = "the sign counts and is next to the digits"},
         {.value = 5.5,
          .withUnit = true,
          .width = 12,

@@ -102,9 +102,9 @@ TEST(UnitFactors, AKeyOfNoUnitGivesNothing)
         EXPECT_EQ(areaUnitFromKey(row.key), std::nullopt) << row.reason;
         EXPECT_EQ(angleUnitFromKey(row.key), std::nullopt) << row.reason;
     }
-    EXPECT_EQ(lengthUnitFromKey(u"m2"), std::nullopt) << "an area is no length";
-    EXPECT_EQ(lengthUnitFromKey(u"deg"), std::nullopt) << "an angle is no length";
-    EXPECT_EQ(areaUnitFromKey(u"m"), std::nullopt) << "a length is no area";
+    EXPECT_EQ(lengthUnitFromKey(u"m2"), std::nullopt) << "an area is not a length";
+    EXPECT_EQ(lengthUnitFromKey(u"deg"), std::nullopt) << "an angle is not a length";
+    EXPECT_EQ(areaUnitFromKey(u"m"), std::nullopt) << "a length is not an area";
     EXPECT_EQ(angleUnitFromKey(u"dms"), std::nullopt) << "only bearings are shown so";
 }
 

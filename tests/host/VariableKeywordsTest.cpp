@@ -49,7 +49,7 @@ TEST(VariableType, CodesWithoutAKeywordHaveNone)
     }
 }
 
-TEST(VariableType, OtherTextsAreNoKeywords)
+TEST(VariableType, OtherTextsAreNotKeywords)
 {
     constexpr struct
     {
@@ -58,10 +58,10 @@ TEST(VariableType, OtherTextsAreNoKeywords)
     } others[] = {
         {u"", "nothing"},
         {u" LENGTH", "a blank in front: values are not trimmed"},
-        {u"LENGTH ", "a blank behind"},
+        {u"LENGTH ", "a blank after it"},
         {u"LENGT", "too short"},
         {u"LENGTHS", "too long"},
-        {u"6", "a code is no keyword"},
+        {u"6", "a code is not a keyword"},
         {u"PLAIN", "the type without a keyword"},
         {u"İNTEGER", "a capital I with a dot does not fold to an I"},
     };

@@ -24,7 +24,7 @@ TEST(Xlate, WithoutATranslationGivesTheTextWithoutItsNote)
         {"", u"", "empty"},
         {"Station", u"Station", "no note"},
         {"Report@@caption of the pane", u"Report", "the note is never shown"},
-        {"Report @@ note", u"Report ", "only what stands behind the mark goes"},
+        {"Report @@ note", u"Report ", "only what follows the mark goes"},
         {"Report@@", u"Report", "an empty note"},
         {"@@note", u"", "nothing but a note"},
         {"@@", u"", "nothing at all"},

@@ -79,7 +79,7 @@ private:
     QStringList sources_;
 };
 
-/// The reports of the batch, made in one process that nobody disturbs.
+/// The reports of the batch, made in one process that is not disturbed.
 QHash<QString, QByteArray> wholeReports()
 {
     const SharedBatch batch;

@@ -121,7 +121,7 @@ TEST(CommandLineBatch, AJobThatFailsDoesNotKeepTheOthersFromBeingMade)
          "a.txt=A b.txt=B",
          {"again.json: error: ", "a.txt\" is written by the job \"a.json\" already", "2 of 3 jobs made, 1 failed"},
          "one file for two reports: the first one stays"},
-        {"render a.json a.json", 2, "a.txt=A", {"1 of 2 jobs made, 1 failed"}, "a job that stands twice"},
+        {"render a.json a.json", 2, "a.txt=A", {"1 of 2 jobs made, 1 failed"}, "a job that is named twice"},
         {"render nodata.json a.json", 2, "a.txt=A", {"none.csv", "1 of 2 jobs made, 1 failed"}, "no data"},
         {"render a.json b.json --set report.0.x=1",
          2,
@@ -181,7 +181,7 @@ TEST(CommandLineBatch, NoTwoJobsWriteOneFile)
         EXPECT_EQ(folder.bytesOf(row.first), "first\n") << row.reason;
         EXPECT_EQ(folder.bytesOf(row.second), row.status == 0 ? "second\n" : "first\n") << row.reason;
     }
-    // A job that has written nothing keeps its file for nobody, and what is no file loses nothing.
+    // A job that has written nothing does not keep its file from others, and a device may be written twice.
     const BatchFolder folder;
     folder.put("bad.json", lineJob("x", "one.txt", "\"template\": {\"file\": \"none.xml\", \"name\": \"N\"}, "));
     folder.put("good.json", lineJob("good", "one.txt"));
@@ -194,7 +194,7 @@ TEST(CommandLineBatch, NoTwoJobsWriteOneFile)
     EXPECT_EQ(folder.run("render 1.json 2.json").status, 0);
 }
 
-TEST(CommandLineBatch, AListThatCannotBeReadIsNoEmptyList)
+TEST(CommandLineBatch, AListThatCannotBeReadIsNotAnEmptyList)
 {
     const BatchFolder folder;
     QProcess process;
@@ -222,7 +222,7 @@ TEST(CommandLineBatch, OutputsOfTheCommandLineTellTheJobsApart)
     constexpr Row rows[] = {
         {"render a.json b.json -o x-{}.txt", 0, "x-a.txt=A x-b.txt=B", "", "the names of the jobs"},
         {"render a.json -o {}-{}.txt", 0, "a-a.txt=A", "", "twice in a name, and for one job as well"},
-        {"render a.json b.json -o -", 0, "", "A\nB\n", "standard output, one behind the other"},
+        {"render a.json b.json -o -", 0, "", "A\nB\n", "standard output, one after the other"},
         {"render a.json b.json -o {}.txt -o -", 0, "a.txt=A b.txt=B", "A\nB\n", "both"},
         {"render a.json b.json -o x.txt", 1, "", "", "one file for two jobs"},
         {"render --jobs list -o x.txt", 1, "", "", "a list may hold any number of jobs"},

@@ -71,7 +71,7 @@ const Row rows[] = {
     {"points.csv", as(QByteArray("\xFF\xFEN\0u\0m\0", 8)), "points.csv:1:", "expected", "UTF-16"},
     {"points.csv", as(QByteArray(5 << 20, 'x')), "points.csv:1:1: error: ", "longer", "an endless line"},
     {"points.csv", with("2A,0\n", QByteArray(5 << 20, '1')), "points.csv:3:1: error: ", "longer",
-     "an endless line behind good ones"},
+     "an endless line after good ones"},
 };
 
 TEST(CommandLineInput, WhatIsWrongIsSaidInOneSentenceAndNothingIsWritten)

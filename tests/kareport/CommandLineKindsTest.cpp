@@ -27,7 +27,7 @@ TEST(CommandLineKinds, TheRichTextImageHasTheStylesOfItsLines)
         const char *reason;
     };
     const Row rows[] = {
-        {"render s.json -o i.dat --as rtf-image", "a name that says no kind"},
+        {"render s.json -o i.dat --as rtf-image", "a name that does not tell the kind"},
         {"render s.json -o i.dat -o r.rtf -o r.rep --as rtf-image", "beside other kinds"},
     };
     for (const Row &row : rows) {
@@ -125,7 +125,7 @@ TEST(CommandLineKinds, APdfGoesToStandardOutputAsWell)
     EXPECT_EQ(PdfReadBack(run.out).pages(), QStringList(QStringLiteral("on paper")));
 }
 
-TEST(CommandLineKinds, AFontFileThatIsNoneLeavesTheEarlierFile)
+TEST(CommandLineKinds, AFontFileThatIsNotOneLeavesTheEarlierFile)
 {
     const CommandLineFolder folder;
     folder.put("s.json", styledJob(R"({"line": "x"})"));
@@ -137,7 +137,7 @@ TEST(CommandLineKinds, AFontFileThatIsNoneLeavesTheEarlierFile)
     const ProgramRun none = runProgram(folder.path(""), words("render s.json -o s.pdf"), {fonts});
     EXPECT_EQ(none.status, 3);
     EXPECT_TRUE(none.err.contains("no fixed-pitch font was found")) << none.all().constData();
-    folder.put("lucon.TTF", "this is no font");
+    folder.put("lucon.TTF", "this is not a font");
     const ProgramRun broken = runProgram(folder.path(""), words("render s.json -o s.pdf"), {fonts});
     EXPECT_EQ(broken.status, 3);
     EXPECT_TRUE(broken.err.contains("lucon.TTF\" cannot be used")) << broken.all().constData();

@@ -111,7 +111,7 @@ TEST(CommandLineOutput, AnOutputThatCannotBeWrittenIsStatus3)
     constexpr Row rows[] = {{"folder.rep", "a folder of that name"},
                             {"folder.txt", "a folder of that name, which is not empty"},
                             {"none/out.rep", "a folder that is not there"},
-                            {"job.json/out.txt", "a file is no folder"}};
+                            {"job.json/out.txt", "a file is not a folder"}};
     for (const Row &row : rows) {
         CommandLineFolder folder;
         ASSERT_TRUE(QDir(folder.path()).mkdir(QStringLiteral("folder.rep")));

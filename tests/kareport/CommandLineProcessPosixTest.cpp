@@ -37,15 +37,15 @@ TEST(CommandLineProcess, NoFileTakesTheNumberOfAClosedDescriptor)
         const char *reason;
     };
     const Row rows[] = {
-        {"render job.json -o out.txt --progress", {2}, 0, "messages would stand in the report"},
+        {"render job.json -o out.txt --progress", {2}, 0, "messages would be in the report"},
         {"render job.json -o out.txt --progress", {0, 1, 2}, 0, "all of them"},
         {"render job.json -o out.txt --progress", {0, 2}, 0, "the output would be the second file that is opened"},
         {"render job.json -o out.txt --progress", {1, 2}, 0, "the same"},
         {"render job.json -o out.txt --progress", {0}, 0, "the first file opened would be standard input"},
-        {"render job.json -o -", {1}, 3, "a report for nobody is not written"},
-        {"render job.json -o -", {0, 1, 2}, 3, "and nobody is told"},
-        {"render --jobs - -o {}.txt", {0}, 2, "a list for nobody is not read"},
-        {"templates t.xml", {1}, 3, "a list for nobody"},
+        {"render job.json -o -", {1}, 3, "a report without a reader is not written"},
+        {"render job.json -o -", {0, 1, 2}, 3, "and nothing can be said"},
+        {"render --jobs - -o {}.txt", {0}, 2, "a list from nowhere is not read"},
+        {"templates t.xml", {1}, 3, "a list without a reader"},
     };
     for (const Row &row : rows) {
         const CommandLineFolder folder;
@@ -119,7 +119,7 @@ TEST(CommandLineProcess, AFileSizeLimitFailsOneJobOfABatch)
     EXPECT_EQ(folder.bytesOf("job.rep"), jobReport()) << "the rest of the batch is made";
 }
 
-/// Waits until the program is blocked in opening or reading what nobody writes, signals it, and answers its end.
+/// Waits until the program is blocked in opening or reading what is never written, signals it, and answers its end.
 ProgramRun runBlocked(const CommandLineFolder &folder, const char *line, int signal)
 {
     QProcess process;
@@ -147,7 +147,7 @@ TEST(CommandLineProcess, TheFirstSignalEndsAReadThatWaits)
         ASSERT_EQ(mkfifo(qPrintable(folder.path("pipe.csv")), 0600), 0);
         folder.put("wait.json", folder.bytesOf("job.json").replace("points.csv", "pipe.csv"));
         folder.put("out.rep", "kept");
-        // Nobody has opened the pipe yet; then somebody has, but writes nothing.
+        // The pipe has not been opened yet; then it has been, but nothing is written.
         ProgramRun run = runBlocked(folder, "render wait.json -o out.rep", signal);
         EXPECT_EQ(run.signal, signal) << run.all().constData();
         const int writer = open(qPrintable(folder.path("pipe.csv")), O_RDWR);

@@ -58,7 +58,7 @@ TEST(CommandLineStream, AFullDiskLeavesTheOldFileAndIsSaidAtOnce)
     EXPECT_EQ(folder.names(), words("job.json out.rep points.csv t.xml"));
 }
 
-TEST(CommandLineStream, WhatIsNoFileGetsTheWholeReportOrNothing)
+TEST(CommandLineStream, WhatIsNotAFileGetsTheWholeReportOrNothing)
 {
     const CommandLineFolder folder;
     ASSERT_EQ(mkfifo(qPrintable(folder.path("out.txt")), 0600), 0);

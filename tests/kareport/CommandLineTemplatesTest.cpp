@@ -120,7 +120,7 @@ TEST(CommandLineCheck, SaysNothingOfAGoodFile)
     EXPECT_EQ(run.err, "");
 }
 
-TEST(CommandLineCheck, SaysWhatIsPassedOverInSilence)
+TEST(CommandLineCheck, SaysWhatIsIgnoredInSilence)
 {
     struct Row
     {
@@ -138,7 +138,7 @@ TEST(CommandLineCheck, SaysWhatIsPassedOverInSilence)
         {"<OutputList>\n<Field>", "<OutputList>\n<Field></Field><Field>", "t.xml:5:1: error: ", 2,
          "an empty element that ends its list"},
         {"<ReportTemplate><Name>SITE", "<ReportTemplate><Tables></Tables><Name>SITE", "t.xml:17:34: error: ", 2,
-         "a name behind the tables"},
+         "a name after the tables"},
         {"<Name>CONTROL</Name><Title>Control points</Title>\n", "\n", "t.xml:", 2, "no name of its own"},
         {"<Type>COORDINATE</Type>", "<Type>COORD</Type>", "t.xml:10:58: error: ", 2, "an unknown type"},
         {"<VariableName>Northing</VariableName><Label>", "<VariableName>Height</VariableName><Label>",
@@ -169,7 +169,7 @@ TEST(CommandLineCheck, SaysWhatIsPassedOverInSilence)
     }
 }
 
-TEST(CommandLineCheck, AFileThatIsNoTemplateIsStatus2)
+TEST(CommandLineCheck, AFileThatIsNotATemplateIsStatus2)
 {
     for (const QByteArray &content :
          {QByteArray(), QByteArray(5000, '\0'), QByteArray("text"), QByteArray("\xFF\xFE<")}) {

@@ -51,7 +51,7 @@ TEST(CommandLineView, WhatCannotBeShownIsSaid)
 
 TEST(CommandLineView, TheDesktopProgramIsStartedWithTheFile)
 {
-    // A copy of the program stands alone, so that it finds the other one on the path.
+    // A copy of the program is in a folder of its own, so that it finds the other one on the path.
     const JobFolder bin;
     ASSERT_TRUE(QFile::copy(QStringLiteral(KAREPORT_PROGRAM), bin.path("kareport")));
     const ViewFolder folder;

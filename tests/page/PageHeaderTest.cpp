@@ -71,7 +71,7 @@ TEST(PageHeader, PlacesTheDateByTheWidthThatTheRowLeaves)
         {QStringLiteral("T"), 9, QStringLiteral("TALVEN - T ") + date + QStringLiteral("    Page:"),
          "a width of -21 is the date's own length"},
         {QStringLiteral("T"), 5, QStringLiteral("TALVEN - T ") + date + QStringLiteral("        Page:"),
-         "a width of -25: the date stands left and is filled on its right"},
+         "a width of -25: the date is on the left, with blanks after it"},
         {QStringLiteral("T"), 0, QStringLiteral("TALVEN - T ") + date + QString(9, u' ') + QStringLiteral("    Page:"),
          "a row of nothing is a width of -30"},
         {QString(), 50, QStringLiteral("TALVEN -  ") + date + QStringLiteral("    Page:"),

@@ -84,7 +84,7 @@ TEST(PageStarts, AnEditCarriesThemAlong)
          0,
          header(7),
          {0, 10, 10 + header(7).size(), 20 + header(7).size()},
-         "put in at a page's start it stands before that page"},
+         "put in at a page's start it comes before that page"},
         {12, 0, header(7), {0, 10, 20 + header(7).size()}, "within a line it is the end of a line"},
     };
     for (const Row &row : rows) {

@@ -206,7 +206,7 @@ TEST(PageWriterHeading, TheObserverIsToldEveryPieceInOrder)
     writer.writeLine(u"b", 1, 2, 2);
     EXPECT_EQ(told(), QStringLiteral("/[2 b]//!"));
     writer.writeLine(u"", 0, 0, 1);
-    EXPECT_EQ(told(), QStringLiteral("!")) << "an empty piece is none";
+    EXPECT_EQ(told(), QStringLiteral("!")) << "an empty piece is not told";
     writer.write(u"c\r\nd", -7);
     EXPECT_EQ(told(), QStringLiteral("[-7 c\r\nd]")) << "line feeds of a piece belong to it";
     writer.lineFeed(2);

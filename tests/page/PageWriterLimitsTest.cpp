@@ -44,7 +44,7 @@ TEST(PageWriterLimits, TheLargestAndLeastNumbersOfLinesTurnThePageOnce)
         {most, 0, lineEnds(6) + x, 3, 1, "more blank lines than are left"},
         {least, 0, lineEnds(6) + x, 3, 1, "below zero"},
         {0, most, x + lineEnds(1) + lineEnds(5), 3, 1, "more lines than are left after the line end"},
-        {0, least, x + lineEnds(1) + lineEnds(5), 3, 1, "one less than the least number is no large one"},
+        {0, least, x + lineEnds(1) + lineEnds(5), 3, 1, "one less than the least number is not a large one"},
         {least, least, lineEnds(6) + x + lineEnds(1) + lineEnds(9), 4, 1, "below zero on both sides"},
         {most, most, lineEnds(6) + x + lineEnds(1) + lineEnds(9), 4, 1, "the largest on both sides"},
     };

@@ -163,7 +163,7 @@ TEST(PageWriterOutlet, WhatFailsIsRememberedAndNothingMoreIsWritten)
     for (int i = 0; i < 10'000; ++i) {
         writer.writeLine(QString(99, u'x'), 0, 1, 0);
     }
-    EXPECT_EQ(device.calls, calls) << "what comes behind a hole is not written";
+    EXPECT_EQ(device.calls, calls) << "what comes after a gap is not written";
     EXPECT_FALSE(writer.emptyIntoOutlet());
     EXPECT_FALSE(outlet.finish());
 }

@@ -143,7 +143,7 @@ TEST(PageWriter, WritingCountsTheLineFeedsOfTheText)
     constexpr Row rows[] = {
         {u"", 0, "nothing"},
         {u"a text without line feeds", 0, "line number and line count stay"},
-        {u"\r", 0, "a carriage return is no line feed"},
+        {u"\r", 0, "a carriage return is not a line feed"},
         {u"a\r\nb\r\n", 2, "two lines"},
         {u"a\nb", 1, "a line feed alone"},
         {u"\n\n\n", 3, "line feeds only"},

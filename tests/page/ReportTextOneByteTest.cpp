@@ -67,7 +67,7 @@ TEST(ReportTextOneByte, TheFirstCharacterAboveU00FFWidensTheText)
     }
 }
 
-TEST(ReportTextOneByte, WideningKeepsEveryCharacterAndTheZerosBehindThem)
+TEST(ReportTextOneByte, WideningKeepsEveryCharacterAndTheZerosAfterThem)
 {
     ReportText text;
     for (int i = 0; i < 40000; ++i) {

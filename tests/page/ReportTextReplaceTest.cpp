@@ -35,7 +35,7 @@ TEST(ReportTextReplace, ReplacesAPieceOfTheText)
     const Row rows[] = {
         {0, 0, QString(), QStringLiteral("ab\r\ncd"), "nothing at all"},
         {0, 0, QStringLiteral("x"), QStringLiteral("xab\r\ncd"), "before the first character"},
-        {6, 0, QStringLiteral("x"), QStringLiteral("ab\r\ncdx"), "behind the last character"},
+        {6, 0, QStringLiteral("x"), QStringLiteral("ab\r\ncdx"), "after the last character"},
         {0, 1, QString(), QStringLiteral("b\r\ncd"), "the first character goes"},
         {5, 1, QString(), QStringLiteral("ab\r\nc"), "the last character goes"},
         {0, 6, QString(), QString(), "everything goes"},
@@ -225,7 +225,38 @@ TEST(ReportTextReplace, WithoutMemoryForUtf16AWiderCharacterIsRefused)
     EXPECT_EQ(memory.largest, LimitedMemory::bytesFor(32000)) << "there was no more to be had";
 }
 
-TEST(ReportTextReplace, GrowingKeepsWhatStandsAfterAnEdit)
+/// What makes a text longer, and how it is then.
+using Grow = bool (*)(ReportText &, QString &);
+const std::pair<Grow, const char *> grows[] = {
+    {[](ReportText &text, QString &expected) {
+         expected += QString(100, u'w');
+         return text.append(QString(100, u'w'));
+     },
+     "a text is written"},
+    {[](ReportText &text, QString &expected) {
+         expected += QStringLiteral("0123456789\r\n");
+         return text.append(QLatin1StringView("0123456789")) && text.appendLineEnd();
+     },
+     "a line is written"},
+    {[](ReportText &text, QString &) { return text.reserve(text.size() + 32001); }, "room is made"},
+    {[](ReportText &text, QString &expected) {
+         expected.insert(3, QString(70000, u'i'));
+         return text.replace(3, 0, QString(70000, u'i'));
+     },
+     "a long text is inserted"},
+    {[](ReportText &text, QString &expected) {
+         expected.insert(3, QString(40000, u'i'));
+         return text.replace(3, 0, QString(40000, u'i'));
+     },
+     "a text is inserted and kept for later"},
+    {[](ReportText &text, QString &expected) {
+         expected += QString(100, u'w') + wide;
+         return text.append(QString(100, u'w') + wide);
+     },
+     "the text becomes one of two bytes a character"},
+};
+
+TEST(ReportTextReplace, GrowingKeepsWhatIsAfterAnEdit)
 {
     struct Row
     {
@@ -236,41 +267,12 @@ TEST(ReportTextReplace, GrowingKeepsWhatStandsAfterAnEdit)
         const char *reason;
     };
     const Row rows[] = {
-        {31990, 5, 1, QStringLiteral("XY"), "near the start: nearly all of the text stands after it"},
+        {31990, 5, 1, QStringLiteral("XY"), "near the start: nearly all of the text is after it"},
         {31990, 0, 0, QStringLiteral("X"), "before the first character"},
         {31990, 31989, 1, QString(), "the last character goes"},
         {31990, 100, 20000, QString(), "most of the text goes"},
         {63990, 32000, 1, QStringLiteral("XY"), "where a block ends"},
         {31990, 5, 1, QString(70000, u'X'), "longer than what is kept to be carried out later"},
-    };
-    using Grow = bool (*)(ReportText &, QString &);
-    const std::pair<Grow, const char *> grows[] = {
-        {[](ReportText &text, QString &expected) {
-             expected += QString(100, u'w');
-             return text.append(QString(100, u'w'));
-         },
-         "a text is written"},
-        {[](ReportText &text, QString &expected) {
-             expected += QStringLiteral("0123456789\r\n");
-             return text.append(QLatin1StringView("0123456789")) && text.appendLineEnd();
-         },
-         "a line is written"},
-        {[](ReportText &text, QString &) { return text.reserve(text.size() + 32001); }, "room is made"},
-        {[](ReportText &text, QString &expected) {
-             expected.insert(3, QString(70000, u'i'));
-             return text.replace(3, 0, QString(70000, u'i'));
-         },
-         "a long text is inserted"},
-        {[](ReportText &text, QString &expected) {
-             expected.insert(3, QString(40000, u'i'));
-             return text.replace(3, 0, QString(40000, u'i'));
-         },
-         "a text is inserted and kept for later"},
-        {[](ReportText &text, QString &expected) {
-             expected += QString(100, u'w') + wide;
-             return text.append(QString(100, u'w') + wide);
-         },
-         "the text becomes one of two bytes a character"},
     };
     for (const Row &row : rows) {
         for (const auto &[grow, how] : grows) {

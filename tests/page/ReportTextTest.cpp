@@ -78,7 +78,7 @@ TEST(ReportText, GrowingPastABlockKeepsEveryCharacterWrittenBefore)
     }
 }
 
-TEST(ReportText, ASurrogatePairMayStandAcrossTheBlockBoundary)
+TEST(ReportText, ASurrogatePairMayCrossTheBlockBoundary)
 {
     ReportText text;
     const QString start = pattern(31999);
@@ -145,7 +145,7 @@ TEST(ReportText, WithoutMemoryALineEndAnswersFalseAndChangesNothing)
     };
     constexpr Row rows[] = {
         {31996, true, "room to spare"},
-        {31997, true, "a line end asks for three characters: CR, LF and the 0 behind them"},
+        {31997, true, "a line end asks for three characters: CR, LF and the 0 after them"},
         {31998, false, "CR and LF alone would fit, the third character does not"},
         {32000, false, "the block is full"},
     };

@@ -33,7 +33,7 @@ TEST(TextStoreRandom, SequencesThatWereFoundOnceStayMended)
         {{{Op::Write, 0, 0, 31990, Letters::OneByte, 0},
           {Op::Replace, 5, 1, 2, Letters::OneByte, 0},
           {Op::Write, 0, 0, 100, Letters::OneByte, 0}},
-         "what stood after an edit was gone when the text grew"},
+         "what came after an edit was gone when the text grew"},
     };
     for (const Row &row : rows) {
         EXPECT_FALSE(textstore::violationOf(row.steps)) << row.reason << ":\n" << textstore::reportOf(row.steps);

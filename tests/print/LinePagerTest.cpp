@@ -30,7 +30,7 @@ TEST(LinePager, TakesAsManyLinesAsFit)
     const Row rows[] = {
         {0, 3, {0}, "an empty text"},
         {1, 3, {0}, "one line"},
-        {3, 3, {0}, "a full page; the line behind the last line's end takes no page"},
+        {3, 3, {0}, "a full page; the line after the last line's end takes no page"},
         {4, 3, {0, 15}, "one line more"},
         {7, 3, {0, 15, 30}, "two full pages and a line"},
         {3, 1, {0, 5, 10}, "a line a page"},
@@ -61,12 +61,12 @@ TEST(LinePager, AnswersTheFirstCharacterThatDidNotFit)
         {8, -1, 12, "the last line"},
         {0, 2, 2, "up to the middle of a line"},
         {0, 5, 5, "up to a line's start"},
-        {0, 100, 5, "a stop behind the end is the end"},
+        {0, 100, 5, "a stop past the end is the end"},
         {0, 12, 5, "a stop at the end"},
         {5, 5, 5, "nothing asked for"},
         {6, 5, 6, "a stop in front of the start"},
-        {12, -1, 12, "behind the last character"},
-        {99, -1, 99, "far behind it"},
+        {12, -1, 12, "past the last character"},
+        {99, -1, 99, "far past it"},
         {-1, -1, -1, "in front of the first"},
     };
     for (const Row &row : rows) {
@@ -88,7 +88,7 @@ TEST(LinePager, LongLinesGoOnInTheNextRow)
         {QStringLiteral("12345678901\nx"), {0, 10, 12}, "one character more goes into a row of its own"},
         {QStringLiteral("1234 67890 2345\nx"), {0, 11, 16}, "broken at a blank, which stays with its word"},
         {QStringLiteral("x\n\n1234567890123456789012345"), {0, 2, 3, 13, 23}, "a long last line"},
-        {QStringLiteral("1234567890       6"), {0, 17}, "blanks at a row's end stand in the margin"},
+        {QStringLiteral("1234567890       6"), {0, 17}, "blanks at a row's end are in the margin"},
     };
     for (const Row &row : rows) {
         PagedText text(row.text);
@@ -96,7 +96,7 @@ TEST(LinePager, LongLinesGoOnInTheNextRow)
     }
 }
 
-TEST(LinePager, TabsStandWhereTheScreenHasThem)
+TEST(LinePager, TabsAreWhereTheScreenHasThem)
 {
     PagedText text(QStringLiteral("a\tb\nc"));
     // 80 pixels of a screen of 96 dots per inch are 500 dots of 600: twelve characters and a half.
@@ -175,7 +175,7 @@ TEST(LinePager, ALineIsAsHighAsItsLargestCharacters)
     cursor.mergeCharFormat(large);
     EXPECT_EQ(text.pager().layOut(PagedText::room(3, 80), 0, -1), 10) << "78 + 154 dots, and 2 are left of 3 * 78";
     EXPECT_EQ(text.pager().layOut(PagedText::room(4, 80), 0, -1), 15);
-    EXPECT_EQ(text.pager().layOut(PagedText::room(3, 80), 10, -1), 20) << "the lines behind are as before";
+    EXPECT_EQ(text.pager().layOut(PagedText::room(3, 80), 10, -1), 20) << "the lines after are as before";
 }
 
 TEST(LinePager, CountsAlikeWhetherItDrawsOrNot)

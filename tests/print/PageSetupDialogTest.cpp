@@ -197,7 +197,7 @@ TEST(PageSetupDialog, ShowsWhichPagesApplyAndSwitchesThem)
     }
 }
 
-TEST(PageSetupDialog, WithoutAReportNobodyIsAskedForItsPages)
+TEST(PageSetupDialog, WithoutAReportItsPagesAreNotAskedFor)
 {
     PageSetup setup = usualSetup();
     setup.asksForPages = false;
@@ -327,7 +327,7 @@ TEST(PageSetupDialog, AMarginThatTheFieldCannotShowStaysUntilItIsChanged)
     PageSetupDialog dialog(setup);
     EXPECT_EQ(field(dialog, "Left margin")->value(), 0.0);
     EXPECT_EQ(field(dialog, "Top margin")->value(), 2000.0);
-    EXPECT_EQ(dialog.setup().margins, setup.margins) << "nobody has touched them";
+    EXPECT_EQ(dialog.setup().margins, setup.margins) << "they were not touched";
     field(dialog, "Top margin")->setValue(12.34);
     EXPECT_EQ(dialog.setup().margins, QMargins(-500, 1234, 1200, 200001)) << "but for one";
 }

@@ -89,7 +89,7 @@ TEST(PrintJob, NothingToPrintLeavesTheFileAsItWas)
         int from;
         const char *reason;
     };
-    for (const Row &row : {Row{0, 0, "no page"}, Row{3, 4, "a range behind the end"}}) {
+    for (const Row &row : {Row{0, 0, "no page"}, Row{3, 4, "a range past the end"}}) {
         PagedText text;
         QFile(text.file()).open(QIODevice::WriteOnly);
         NumberedPages pages(row.pages);
@@ -132,7 +132,7 @@ TEST(PrintJob, StopsAtTheLastPageThatIsAskedForAndSaysWhatIsLeftOut)
     PagedText text;
     NumberedPages pages(5);
     text.printer().setFromTo(1, 2);
-    EXPECT_FALSE(kareport::printPages(text.printer(), pages.source, nullptr, 2).isCut) << "nobody asks for more";
+    EXPECT_FALSE(kareport::printPages(text.printer(), pages.source, nullptr, 2).isCut) << "no more are asked for";
 }
 
 TEST(PrintJob, WindowsAnswerWhileItPrintsAndTheProgressIsShown)

@@ -113,7 +113,7 @@ TEST(PrintSheets, TheWidestRowDecidesAndWhatIsStillTooWideIsBroken)
     const Row rows[] = {
         {QString(20, u'x'), 1, 1, "fits"},
         {QString(25, u'x'), 0.8, 1, "25 characters on 20"},
-        {QString(20, u'x') + QString(50, u' '), 1, 1, "blanks at its end may stand in the margin"},
+        {QString(20, u'x') + QString(50, u' '), 1, 1, "blanks at its end may be in the margin"},
         {QString(32, u'x'), 0.625, 1, "just at 5 points"},
         {QString(40, u'x'), 0.625, 1, "broken into two rows; the page has room for them"},
         {QString(32 * 40, u'x'), 0.625, 2, "40 rows and 4: 32 rows of 5 points a sheet"},

@@ -81,7 +81,7 @@ TEST(DataBlock, ALaterPageCarriesNoStaleHeading)
     b.report.SetHeading(QStringLiteral("Stale"), 3, 3);
     EXPECT_EQ(b.write(0, -1), reportLines(QStringLiteral("Point|1\n") + QString(8, u'\n') +
                                           headerOf(QStringLiteral("Title"), 2) + QStringLiteral("\n\n\n\n\n\n")))
-        << "no lines before an empty heading and two behind it";
+        << "no lines before an empty heading and two after it";
 }
 
 TEST(DataBlock, SeparatorsAreWrittenAsTheyAre)

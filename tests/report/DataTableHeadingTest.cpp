@@ -47,7 +47,7 @@ TEST(DataTableHeading, TheChainageLabelIsStationUnlessItIsSet)
     EXPECT_EQ(t.write(0, 0, 1), reportLines(QStringLiteral("Distance    |Station \n")));
 }
 
-TEST(DataTableHeading, NorthingAndEastingStandInTheJobsOrder)
+TEST(DataTableHeading, NorthingAndEastingAreInTheJobsOrder)
 {
     TableReport t(
         {field("Number", "Pt", "5"), field("Northing", "N", "7.3", "RIGHT"), field("Easting", "East", "6.3", "RIGHT")},

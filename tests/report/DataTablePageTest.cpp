@@ -65,7 +65,7 @@ TEST(DataTablePage, AnEmptyReportWithHeadersGetsHeaderAndHeading)
     EXPECT_EQ(t.report.GetPageNumber(), 1);
 }
 
-TEST(DataTablePage, TheTablesNameStandsOverItsHeadingInTheMiddleOfAPage)
+TEST(DataTablePage, TheTablesNameIsAboveItsHeadingInTheMiddleOfAPage)
 {
     TableReport t(pointColumn, "124");
     t.add("1");
@@ -101,7 +101,7 @@ TEST(DataTablePage, APageThatTheLastRowTurnsHasNoHeading)
     EXPECT_EQ(t.write(0, 0, 1),
               reportLines(header(1) + QStringLiteral("Point\n1    \n2    \n3    \n4    \n5    \n6    \n\n") +
                           header(2) + QStringLiteral("\n\n")))
-        << "two lines stand behind the cleared heading";
+        << "two lines follow the cleared heading";
     EXPECT_EQ(t.report.GetPageNumber(), 2);
     EXPECT_EQ(t.report.GetLineNumber(), 7);
 }
@@ -131,7 +131,7 @@ TEST(DataTablePage, TheHeadingDoesNotOutliveItsTable)
     const qsizetype size = t.report.GetText().size();
     t.report.NewPage(-1);
     EXPECT_TRUE(t.report.GetText().sliced(size).toString().endsWith(reportLines(header(2) + QStringLiteral("\n\n"))))
-        << "no heading, no lines before it and two behind it";
+        << "no heading, no lines before it and two after it";
 }
 
 TEST(DataTablePage, LinesBeforeBelowZeroBeginANewPage)
@@ -153,7 +153,7 @@ TEST(DataTablePage, ATableWithoutLabelsHasNoHeading)
     t.report.WriteTableName(true);
     t.goToLine(70);
     EXPECT_EQ(t.write(0, 0, -1), reportLines(QStringLiteral("-5\n")))
-        << "an empty heading needs no place, and no name stands over it";
+        << "an empty heading needs no place, and no name is above it";
 }
 
 } // namespace

@@ -40,7 +40,7 @@ TEST(DataTable, WritesHeadingAndALineForEachObject)
     EXPECT_TRUE(t.report.IsModified());
 }
 
-TEST(DataTable, LinesBeforeAfterAndBehindTheHeadingAreAsAskedFor)
+TEST(DataTable, LinesAroundAndWithinTheHeadingAreAsAskedFor)
 {
     struct Row
     {
@@ -56,7 +56,7 @@ TEST(DataTable, LinesBeforeAfterAndBehindTheHeadingAreAsAskedFor)
         {0, 0, 0, u"P1\n", "the heading stays open"},
         {0, 0, 1, u"P\n1\n", "no blank line"},
         {0, 0, 3, u"P\n\n\n1\n", "two blank lines"},
-        {0, 0, -2, u"P1\n", "any other number below 0 is no line"},
+        {0, 0, -2, u"P1\n", "any other number below 0 means no line"},
         {2, 3, 1, u"\n\nP\n1\n\n\n\n", "blank lines around"},
     };
     for (const Row &expected : rows) {
@@ -87,12 +87,12 @@ TEST(DataTable, RowsEndWithoutATrailingSeparatorButWithTheFillersBlanks)
         const char *reason;
     };
     const Row rows[] = {
-        {{number(), field("Note", "", "3")}, "124", QStringLiteral("1    |ab "), "no separator behind a normal field"},
+        {{number(), field("Note", "", "3")}, "124", QStringLiteral("1    |ab "), "no separator after a normal field"},
         {{number(), field("FILLER", "", "3")}, "124", QStringLiteral("1    |   "), "a filler's blanks end the row"},
         {{number(), field("filler", "", "3"), field("Note", "", "3")},
          "124",
          QStringLiteral("1    |   ab "),
-         "no separator behind a filler, in any case of its name"},
+         "no separator after a filler, in any case of its name"},
         {{field("FILLER", "", "2"), number()}, "124", QStringLiteral("  1    "), "a filler in front"},
         {{number(), field("FILLER", "", "3")},
          "32",
@@ -149,7 +149,7 @@ TEST(DataTable, SuffixMarkersReachTheNextFormattedFieldOnly)
         {{offset}, QStringLiteral("   2.50L"), "left of the line"},
         {{plus, offset}, QStringLiteral("   -2.50"), "with its sign"},
         {{right, offset}, QStringLiteral("   2.50L"), "the suffix R shows the side"},
-        {{plus, offset, second}, QStringLiteral("   -2.50|   1.25R"), "the field behind has none"},
+        {{plus, offset, second}, QStringLiteral("   -2.50|   1.25R"), "the field after it has none"},
         {{second, plus, offset}, QStringLiteral("   1.25R|   -2.50"), "before the last field"},
         {{plus, plus, offset}, QStringLiteral("   -2.50"), "twice is once"},
         {{plus, right, offset}, QStringLiteral("   2.50L"), "the last marker counts"},
@@ -173,7 +173,7 @@ TEST(DataTable, SuffixMarkersReachTheNextFormattedFieldOnly)
     }
 }
 
-TEST(DataTable, SeparatorsStandBetweenHeadingColumnsAndBetweenValues)
+TEST(DataTable, SeparatorsAreBetweenHeadingColumnsAndBetweenValues)
 {
     struct Row
     {

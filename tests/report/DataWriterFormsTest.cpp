@@ -14,7 +14,7 @@ QString header(int page)
     return headerOf(QStringLiteral("Title"), page) + QStringLiteral("\n\n\n\n");
 }
 
-TEST(DataWriterForms, TheNameStandsBelowTheHeaderOfAFreshReport)
+TEST(DataWriterForms, TheNameIsBelowTheHeaderOfAFreshReport)
 {
     TableReport t(pointColumn, "124");
     t.add("1");

@@ -71,7 +71,7 @@ TEST(EditedText, WhatCannotBePrintedBecomesABlank)
     }
 }
 
-TEST(EditedText, IsBrokenBehindABlankAtColumn80)
+TEST(EditedText, IsBrokenAfterABlankAtColumn80)
 {
     const std::u16string x77(77, u'x');
     const std::u16string x78(78, u'x');
@@ -89,18 +89,18 @@ TEST(EditedText, IsBrokenBehindABlankAtColumn80)
         {x80 + x80, x80 + x80, "a word is never broken"},
         {x77 + u" a b", x77 + u" a \nb", "the 79th character is within the line, the 81st is not"},
         {x78 + u" a", x78 + u" \na", "the 80th character begins a word"},
-        {x79 + u" a", x79 + u" \na", "the first word that begins behind it"},
+        {x79 + u" a", x79 + u" \na", "the first word that begins after it"},
         {x77 + u" abcd c", x77 + u" abcd \nc", "a word that has begun before stays"},
         {x79 + u"   a", x79 + u"   \na", "all blanks stay before the break"},
-        {x79 + u" ", x79 + u" ", "no word behind the blank"},
-        {x80 + u" ab " + x78 + u" c", x80 + u" \nab " + x78 + u" \nc", "counted anew behind a break"},
-        {x79 + u" " + x78 + u" a b", x79 + u" \n" + x78 + u" a \nb", "the character behind a break counts as none"},
+        {x79 + u" ", x79 + u" ", "no word after the blank"},
+        {x80 + u" ab " + x78 + u" c", x80 + u" \nab " + x78 + u" \nc", "counted anew after a break"},
+        {x79 + u" " + x78 + u" a b", x79 + u" \n" + x78 + u" a \nb", "the character after a break does not count"},
         {x79 + u"\r\nb c", x79 + u"\r\r\nb c", "LF gets a CR, and the counting begins anew"},
         {x79 + u"\nb c", x79 + u"\r\nb c", "LF alone gets a CR"},
         {x79 + u"\r b", x79 + u"\r b", "CR alone begins the counting anew and stays alone"},
         {u"\n", u"\r\n", "nothing but a line end"},
         {u"\n\n", u"\r\n\r\n", "line ends alone"},
-        {x79 + u"\ta", x79 + u"\ta", "a tab is no blank"},
+        {x79 + u"\ta", x79 + u"\ta", "a tab is not a blank"},
         {std::u16string(79, u'測') + u" 量", std::u16string(79, u'測') + u" \n量", "characters count, not their width"},
         {std::u16string(80, u' ') + u"a", std::u16string(80, u' ') + u"\na", "blanks in front count as well"},
     };

@@ -9,7 +9,7 @@ namespace
 
 using kareport::EditorKind;
 
-TEST(EditorKind, ADotInAFolderIsNoneOfTheProgramsName)
+TEST(EditorKind, ADotInAFolderIsNotPartOfTheProgramsName)
 {
     struct Row
     {
@@ -30,7 +30,7 @@ TEST(EditorKind, ADotInAFolderIsNoneOfTheProgramsName)
         {u"/opt/winword/", u"", "a folder only"},
         {u"/opt/winword.exe/", u"", "a folder only"},
         {u"winword", u"winword", "a name only"},
-        {u"C:winword.exe", u"C:winword", "a drive is no folder"},
+        {u"C:winword.exe", u"C:winword", "a drive is not a folder"},
         {u"/opt/測量.é/Ω é.x", u"Ω é", "characters beyond ASCII"},
         {u".", u"", "a dot only"},
         {u"\\", u"", "a separator only"},

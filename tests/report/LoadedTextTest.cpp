@@ -51,7 +51,7 @@ TEST(LoadedText, IsWhatTheDecoderGives)
         {mark + "A\r", "no line end at all"},
         {mark + mark + "A", "a second mark is a character"},
         {mark + "\xC3\xA9\xE2\x88\x9E\xF0\x9F\x98\x80\r\r\n", "two, three and four bytes"},
-        {"A\nB\r\nC\r\r\nD", "a text of somebody else"},
+        {"A\nB\r\nC\r\r\nD", "a text of another program"},
         {QByteArray("a\0b\n", 4), "a NUL is a character"},
     };
     for (const Row &row : rows) {
@@ -95,7 +95,7 @@ TEST(LoadedText, KeepsOneByteACharacterAsLongAsThatIsEnough)
     EXPECT_FALSE(wide.text.isNarrow());
 }
 
-TEST(LoadedText, IsAnotherTextWhereItIsNoUtf8OrRichText)
+TEST(LoadedText, IsAnotherTextWhereItIsNotUtf8OrIsRichText)
 {
     const QByteArray lines = QByteArray("a line\r\r\n").repeated(60'000);
     struct Row
@@ -140,7 +140,7 @@ TEST(LoadedText, KnowsItsPages)
     EXPECT_TRUE(source.pageStarts.empty()) << "the lines of a source are not those that it shows";
 }
 
-TEST(LoadedText, StopsWhenNobodyWaits)
+TEST(LoadedText, StopsWhenItIsNotWaitedFor)
 {
     const QByteArray bytes = mark + QByteArray("a line\r\r\n").repeated(200'000);
     qint64 told = 0;

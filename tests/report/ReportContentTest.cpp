@@ -31,7 +31,7 @@ TEST(ReportContent, TheFontIsOfFixedPitchAlsoWhereTheFaceIsMissing)
     EXPECT_TRUE(font.fixedPitch());
     const QFontMetricsF metrics(reportFont(QStringLiteral("No Such Face"), 9));
     EXPECT_EQ(metrics.horizontalAdvance(u'i'), metrics.horizontalAdvance(u'W'));
-    EXPECT_GT(reportFont(QStringLiteral("Lucida Console"), 0).pointSize(), 0) << "a size of 0 is none";
+    EXPECT_GT(reportFont(QStringLiteral("Lucida Console"), 0).pointSize(), 0) << "a size of 0 is ignored";
 }
 
 TEST(ReportContent, WhatBeginsAsRichTextIsShownAsSuch)
@@ -115,7 +115,7 @@ TEST(ReportContent, InRichTextModeTheImageIsShown)
     spreadsheet.SetRTFDataFlag(true);
     spreadsheet.Write(QStringLiteral("A\tB\n{C}"), 1);
     EXPECT_EQ(showReportContent(spreadsheet, document), std::nullopt);
-    EXPECT_EQ(document.toPlainText(), QStringLiteral("A\tB\n{C}")) << "bare text for a spreadsheet is no rich text";
+    EXPECT_EQ(document.toPlainText(), QStringLiteral("A\tB\n{C}")) << "bare text for a spreadsheet is not rich text";
 }
 
 TEST(ReportContent, PlainTextHasTheReportsFont)

@@ -51,7 +51,7 @@ TEST(ReportSaveName, TheNameSaysWhatIsSaved)
         bool isPdf;
     };
     const Row rows[] = {
-        {u"a.rep", false, false}, {u"a.rtf", true, false},      {u"a.PDF", false, true},
+        {u"a.rep", false, false},    {u"a.rtf", true, false},      {u"a.PDF", false, true},
         {u"a.pdf.rtf", true, false}, {u"a.pdf.pdf", false, false}, {u"/plans.pdf/a.pdf", false, false},
     };
     for (const Row &row : rows) {

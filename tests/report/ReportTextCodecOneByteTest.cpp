@@ -67,7 +67,7 @@ TEST(ReportTextCodecOneByte, AReportOfLatin1OnlyIsSavedInUtf8)
     EXPECT_EQ(file.readAll().toHex(' ').toStdString(), "ef bb bf 31 32 c2 b0 c3 bf 0d 0d 0a");
 }
 
-TEST(ReportTextCodecOneByte, ALineEndMayStandAcrossTwoPieces)
+TEST(ReportTextCodecOneByte, ALineEndMayBeInTwoPieces)
 {
     for (qsizetype at = 65532; at <= 65538; ++at) {
         const QByteArray front(at, 'x');
@@ -76,7 +76,7 @@ TEST(ReportTextCodecOneByte, ALineEndMayStandAcrossTwoPieces)
         EXPECT_TRUE(written(view, LineEnds::ReportFile) == "\xEF\xBB\xBF" + front + "\r\r\n\xC3\xA9") << at;
         EXPECT_TRUE(written(view, LineEnds::PlainText) == front + "\n\xC3\xA9") << at;
         const QByteArray cutOff = front + '\r';
-        EXPECT_TRUE(written(QLatin1StringView(cutOff), LineEnds::PlainText) == cutOff) << at << ": no LF behind it";
+        EXPECT_TRUE(written(QLatin1StringView(cutOff), LineEnds::PlainText) == cutOff) << at << ": no LF after it";
     }
 }
 

@@ -26,9 +26,9 @@ TEST(TemporaryNames, TheStemIsTheReportsNameWithoutExtension)
         {u"/x/Survey", u"Survey", "the same where folders have another mark"},
         {u"C:\\x/y\\z/Survey", u"Survey", "both marks"},
         {u"Survey", u"Survey", "no folder"},
-        {u"C:\\x\\Survey.rep", u"Report$$$", "three letters behind the point leave nothing"},
+        {u"C:\\x\\Survey.rep", u"Report$$$", "three letters after the point leave nothing"},
         {u"Survey.re", u"Report$$$", "two letters leave nothing"},
-        {u"Survey.", u"Report$$$", "nothing behind the point"},
+        {u"Survey.", u"Report$$$", "nothing after the point"},
         {u".", u"Report$$$", "a point alone"},
         {u"Survey.text", u"t", "what is more than three letters is what is left"},
         {u"Survey.report", u"ort", "what is more than three letters is what is left"},
@@ -84,7 +84,7 @@ TEST(TemporaryNames, AFoldersOwnSeparatorIsNotDoubled)
         << "no folder, no separator";
 }
 
-TEST(TemporaryNames, BehindTheThousandthItIsGivenAgain)
+TEST(TemporaryNames, AfterTheThousandthItIsGivenAgain)
 {
     TemporaryNames names;
     const QString folder = QStringLiteral("/t");

@@ -99,7 +99,7 @@ TEST_F(UReportDocEditorClose, AFileThatIsLoadedGoesToTheEditorBeforeItsReportClo
     report = create();
     report->SetCloseDocumentFlag(true);
     EXPECT_TRUE(report->OnOpenDocument(at("in.rep")));
-    EXPECT_TRUE(UReportDoc::IsReportAvailable(report)) << "whoever opens it goes on with it";
+    EXPECT_TRUE(UReportDoc::IsReportAvailable(report)) << "the code that opens it goes on with it";
     EXPECT_EQ(launches.files(), (QStringList{at("Report$$$.rep"), at("Report$$$ 2.rep")}));
 }
 

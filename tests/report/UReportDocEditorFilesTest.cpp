@@ -104,7 +104,7 @@ TEST_F(UReportDocEditorFiles, OfRichTextThatCannotBeMadeGiveWayToTheText)
 
     ASSERT_TRUE(QDir().mkdir(at("x.rtf")));
     createWritten(QStringLiteral("b"))->UpdateAllViews(nullptr);
-    EXPECT_EQ(launches.files().value(1), at("x.rtf/b 2.rtf")) << "with such a folder it stands there";
+    EXPECT_EQ(launches.files().value(1), at("x.rtf/b 2.rtf")) << "with such a folder it goes there";
 }
 
 TEST_F(UReportDocEditorFiles, ThatCannotBeMadeAreStillNamedToTheEditor)

@@ -34,7 +34,7 @@ TEST_F(UReportDocEditor, IsUsedByAMarkedReportWhereItIsPreferredChosenAndInstall
     EXPECT_TRUE(report.UsePreferredReportEditor());
     for (const QString &path : {folder.path(), QString(), editor + u' ', u' ' + editor, editor + QStringLiteral("2")}) {
         WriteProfileString(QString(), GetPreferredReportEditorRegKey(), path);
-        EXPECT_FALSE(report.UsePreferredReportEditor()) << path.toStdString() << " is no such file";
+        EXPECT_FALSE(report.UsePreferredReportEditor()) << path.toStdString() << " does not exist";
     }
 }
 

@@ -45,7 +45,7 @@ TEST_F(UReportDocEditorWord, IsHandedASecondHiddenReport)
     EXPECT_TRUE(converted->GetRTFDataFlag());
     EXPECT_EQ(converted->GetReportFileName(), QStringLiteral("Survey"));
     EXPECT_TRUE(converted->IsOptionExcel());
-    EXPECT_FALSE(converted->IsExternalExcel()) << "the editor is none";
+    EXPECT_FALSE(converted->IsExternalExcel()) << "the editor is not one";
     EXPECT_FALSE(converted->IsModified());
     EXPECT_EQ(textOf(*converted), QStringLiteral("text\r\r\n"));
     EXPECT_EQ(converted->GetLineCount(), 2) << "its own count and one more for each line";
@@ -83,7 +83,7 @@ TEST_F(UReportDocEditorWord, GetsEveryLineThatIsNotBlank)
         {QStringLiteral("A\r\nB"), {"A\r", "B"}, "a last line that is open"},
         {QStringLiteral("A"), {"A"}, "an open line only"},
         {QStringLiteral("A\r\r\n\r\r\nB"), {"A\r\r", "B"}, "as a report file has its line ends"},
-        {QStringLiteral("A\rB\r\n"), {"A\rB\r"}, "a CR inside a line is no line end"},
+        {QStringLiteral("A\rB\r\n"), {"A\rB\r"}, "a CR inside a line is not a line end"},
         {QStringLiteral("A\r\n \r\n\t\r\nB"), {"A\r", " \r", "\t\r", "B"}, "a line of blanks is a line"},
         {QStringLiteral("  A  \r\n"), {"  A  \r"}, "blanks around a text stay"},
         {QStringLiteral("\r\n"), {}, "nothing but a blank line"},

@@ -243,7 +243,7 @@ TEST(UReportDocFields, EveryNewReportReadsThePrintHashEntry)
         {QString(), false, "an empty entry leaves it as it was"},
         {QStringLiteral("  -7 "), true, "any number but 0, trimmed"},
         {QStringLiteral("yes"), false, "a text without a number is 0"},
-        {QStringLiteral("2x"), true, "a number with something behind it"},
+        {QStringLiteral("2x"), true, "a number with something after it"},
         {QStringLiteral("00"), false, "0 in two digits"},
     };
     for (const Row &row : rows) {

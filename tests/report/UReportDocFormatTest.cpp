@@ -55,7 +55,7 @@ TEST(UReportDocFormat, OffsetIsShownInTheStyleThatIsHandedIn)
         {-2.5, "", "    2.5L", "the length in 7 columns, then the side"},
         {2.5, "", "    2.5R", "the other side"},
         {0, "", "     0.0", "on the line: neither sign nor side"},
-        {-2.5, "R", "    2.5L", "the marker's R is no sign"},
+        {-2.5, "R", "    2.5L", "the marker's R is not a sign"},
         {-2.5, "-", "    2.5L", "only a plus asks for the sign"},
         {-2.5, "+ ", "    2.5L", "only a plus alone"},
     };

@@ -129,7 +129,7 @@ TEST(UReportDocLife, ClosingEndsEveryPaneOfTheReport)
         showIn<UView>(*pane, *report);
     }
     report->OnCloseDocument();
-    EXPECT_EQ(log, QStringLiteral("closed emptied gone ")) << "without an owner nobody is told";
+    EXPECT_EQ(log, QStringLiteral("closed emptied gone ")) << "without an owner nothing is told";
     EXPECT_FALSE(isOpen(QStringLiteral("pane")));
 }
 
@@ -285,7 +285,7 @@ TEST(UReportDocLife, ANewReportIsMeasuredAndUnmodified)
     EXPECT_EQ(report.GetPrintResolution(), 600U);
     kareport::setDefaultPrinter({kareport::PrinterSource::None, kareport::PaperSize::A4, 600});
     UReportDoc unmeasured;
-    EXPECT_TRUE(unmeasured.OnNewDocument()) << "no printer is no failure";
+    EXPECT_TRUE(unmeasured.OnNewDocument()) << "no printer is not a failure";
     EXPECT_EQ(unmeasured.GetLinesPerPage(), 72);
 }
 

@@ -106,7 +106,7 @@ TEST(UReportDocLoadLongLines, ALineOfRichTextStaysInOnePiece)
         {"{\\rtf1 " + words + "}\n", QStringLiteral("{\\rtf1 ") + long_ + QStringLiteral("}\n\r\n"), "with a line end"},
         {"{\\rtf1\r\n" + words + "\r\n" + words + "\r\n}",
          QStringLiteral("{\\rtf1\n\r\n") + long_ + QStringLiteral("\n\r\n") + long_ + QStringLiteral("\n\r\n}\r\n"),
-         "long lines behind the first"},
+         "long lines after the first"},
         {" \t{\\rtf1 " + words + "}", QStringLiteral(" \t{\\rtf1 ") + long_ + QStringLiteral("}\r\n"),
          "white space in front"},
         {"{\\rtf1 " + QByteArray(1015, 'x') + "\n}",

@@ -48,7 +48,7 @@ TEST(UReportDocLoad, EveryByteIsACharacterAndEveryLineGetsALineEnd)
         {"A\r\r\n", QStringLiteral("A\r\n\r\n"), 3, QStringLiteral("A\r\r\n"), 2, "a line end as reports have it"},
         {"A\rB", QStringLiteral("A\rB\r\n"), 2, QStringLiteral("A\rB\r\n"), 2, "a CR alone ends no line"},
         {"\r", QStringLiteral("\r\r\n"), 2, QStringLiteral("\r\r\n"), 2, "nothing but a CR"},
-        {"A\n\r", QStringLiteral("A\n\r\n\r\r\n"), 5, QStringLiteral("A\r\n\r\r\n"), 4, "a CR behind the last LF"},
+        {"A\n\r", QStringLiteral("A\n\r\n\r\r\n"), 5, QStringLiteral("A\r\n\r\r\n"), 4, "a CR after the last LF"},
         {"\xEF\xBB\xBF", QStringLiteral(u"\xEF\xBB\xBF\r\n"), 2, QStringLiteral(u"\xEF\xBB\xBF\r\n"), 2,
          "nothing but a byte-order mark: three characters"},
         {"\xEF\xBB\xBF"
@@ -62,7 +62,7 @@ TEST(UReportDocLoad, EveryByteIsACharacterAndEveryLineGetsALineEnd)
         {"12\xC2\xB0\n", QStringLiteral(u"12\xC2\xB0\n\r\n"), 3, QStringLiteral(u"12\xC2\xB0\r\n"), 2,
          "the bytes of UTF-8 are characters each"},
         {"\xFF\xC3(\x80\n", QStringLiteral(u"\xFF\xC3(\x80\n\r\n"), 3, QStringLiteral(u"\xFF\xC3(\x80\r\n"), 2,
-         "bytes that are no UTF-8 as well"},
+         "bytes that are not UTF-8 as well"},
         {QByteArray("a\0b\n\0", 5), QString::fromLatin1("a\0b\n\r\n\0\r\n", 9), 5,
          QString::fromLatin1("a\0b\r\n\0\r\n", 8), 4, "bytes of 0 are characters, too"},
         {"a\fb\x1A"
@@ -101,7 +101,7 @@ TEST(UReportDocLoad, TheFirstLineBeginsWithItsWord)
         {"xTALVEN TALVEN\n", QStringLiteral("TALVEN TALVEN\r\n"), "the first one counts"},
         {"TALVEN TALVEN\n", QStringLiteral("TALVEN TALVEN\r\n"), "the first one, at the very beginning"},
         {"x\ny TALVEN\n", QStringLiteral("x\r\ny TALVEN\r\n"), "not in the second line"},
-        {"\nx TALVEN\n", QStringLiteral("\r\nx TALVEN\r\n"), "not behind an empty first line"},
+        {"\nx TALVEN\n", QStringLiteral("\r\nx TALVEN\r\n"), "not after an empty first line"},
         {"x talven\n", QStringLiteral("x talven\r\n"), "in capital letters only"},
         {"x TALVE", QStringLiteral("x TALVE\r\n"), "cut off"},
         {"x TALVEN", QStringLiteral("TALVEN\r\n"), "at the very end"},
@@ -125,7 +125,7 @@ TEST(UReportDocLoad, TheFirstLineBeginsWithItsWord)
             << row.reason;
         const QByteArray front = row.content.left(std::min<qsizetype>(row.content.indexOf('\n'), 3));
         EXPECT_TRUE(textOf(written).sliced(8).startsWith(QString::fromLatin1(front)))
-            << row.reason << ": behind other text nothing is dropped";
+            << row.reason << ": after other text nothing is dropped";
     }
 }
 

@@ -50,7 +50,7 @@ TEST_F(UReportDocOpenAfterSave, OnlyARichTextOfAMarkedReportWithAnEditorIs)
     const Row rows[] = {
         {"a.rtf", true, true, editor.path, true, "the usual case"},
         {"a.RTF", true, true, editor.path, true, "in capitals"},
-        {"a.rtf", true, true, QStringLiteral(" \t") + editor.path + u'\n', true, "blanks around the path are no harm"},
+        {"a.rtf", true, true, QStringLiteral(" \t") + editor.path + u'\n', true, "blanks around the path do no harm"},
         {"a.rtf", false, true, editor.path, false, "not marked"},
         {"a.rtf", true, false, editor.path, false, "not preferred"},
         {"a.rtf", true, true, QString(), false, "none chosen"},
@@ -100,7 +100,7 @@ TEST_F(UReportDocOpenAfterSave, AFileThatCouldNotBeWrittenIsNot)
     showIn<FailingView>(pane, report);
     EXPECT_FALSE(report.OnSaveDocument(at("a.rtf")));
     EXPECT_EQ(contentOf(at("a.rtf")), "earlier");
-    EXPECT_EQ(launches.files(), QStringList()) << "what stands there is not what was saved";
+    EXPECT_EQ(launches.files(), QStringList()) << "what is there is not what was saved";
 }
 
 TEST_F(UReportDocOpenAfterSave, WithoutAViewTheTextIsSavedAndNotOpened)

@@ -54,111 +54,112 @@ protected:
     UReportDoc report;
 };
 
+/// What is written into a report, and the lines of its pages then.
+struct Writing
+{
+    void (*write)(UReportDoc &report);
+    const char16_t *lines;
+    const char *reason;
+};
+constexpr Writing writings[] = {
+    {[](UReportDoc &) {}, u"", "nothing was written"},
+    {[](UReportDoc &r) { rows(r, 1); }, u"5", "header, three blank lines and a row"},
+    {[](UReportDoc &r) { rows(r, 7); }, u"11 1", "the last line of a page stays free, the next page has its header"},
+    {[](UReportDoc &r) { rows(r, 16); }, u"11 11 6", "as counting lines gives it"},
+    {[](UReportDoc &r) {
+         r.SetHeading(QStringLiteral("one\r\ntwo\r\nthree"), 0, 1);
+         rows(r, 9);
+     },
+     u"9 9 9 9 8", "a heading of three lines counts twice: a page of ten lines is full"},
+    {[](UReportDoc &r) {
+         rows(r, 2);
+         r.LineFeed(30);
+         rows(r, 2);
+     },
+     u"6 6", "a long line feed is a page's end"},
+    {[](UReportDoc &r) {
+         rows(r, 1);
+         r.LineFeed(30);
+         r.Write(QStringLiteral("end"), 0);
+     },
+     u"36", "or within the page when nothing begins another one"},
+    {[](UReportDoc &r) {
+         r.SetHeaderFlag(false);
+         rows(r, 1);
+         r.NewPage(-1);
+         r.NewPage(-1);
+         rows(r, 1);
+     },
+     u"1 0 1", "a blank page in between"},
+    {[](UReportDoc &r) {
+         r.SetHeaderFlag(false);
+         rows(r, 1);
+         r.NewPage(-1);
+         r.NewPage(-1);
+     },
+     u"1", "blank pages at the end are not printed"},
+    {[](UReportDoc &r) {
+         rows(r, 1);
+         r.NewPage(-1);
+         r.NewPage(-1);
+     },
+     u"5 1 1", "pages with a header only are"},
+    {[](UReportDoc &r) {
+         for (int i = 0; i < 30; ++i) {
+             r.Write(QStringLiteral("by hand\r\n"), 0);
+         }
+     },
+     u"12 12 6", "no page was begun: counting lines"},
+    {[](UReportDoc &r) {
+         for (int i = 0; i < 13; ++i) {
+             r.Write(QStringLiteral("by hand\r\n"), 0);
+         }
+         rows(r, 1);
+     },
+     u"12 1 5", "what was written before the first page by counting"},
+    {[](UReportDoc &r) {
+         r.SetData(QStringLiteral("a\r\nb\r\n"));
+         rows(r, 1);
+     },
+     u"2 5", "a text and pages after it"},
+    {[](UReportDoc &r) {
+         r.SetData(QStringLiteral("a\r\nb"));
+         rows(r, 1);
+     },
+     u"6", "a page that begins within a line begins nowhere"},
+    {[](UReportDoc &r) {
+         r.SetHeaderFlag(false);
+         r.FixPage(1, 80);
+         rows(r, 3);
+     },
+     u"1 0 1 0 1", "one line a page: a line that is ended begins the next one, and the next line another"},
+    {[](UReportDoc &r) {
+         r.FixPage(1, 80);
+         rows(r, 2);
+     },
+     u"5 1 5 1", "a header that is longer than a page: no page is run out"},
+    {[](UReportDoc &r) {
+         rows(r, 3);
+         r.FixPage(20, 80);
+         rows(r, 20);
+     },
+     u"19 12", "more lines a page from the middle of one on"},
+    {[](UReportDoc &r) {
+         r.WriteLine(QStringLiteral("row"), -1, -1, 0);
+         r.LineFeed(-5);
+         r.WriteLine(QStringLiteral("row"), -1, 1, 0);
+     },
+     u"5 1 5", "counts below 0 begin pages"},
+};
+
 TEST_F(UReportDocPages, ArePagesOfTheirWriterWhateverIsOnThem)
 {
-    struct Row
-    {
-        void (*write)(UReportDoc &report);
-        const char16_t *lines;
-        const char *reason;
-    };
-    constexpr Row table[] = {
-        {[](UReportDoc &) {}, u"", "nothing was written"},
-        {[](UReportDoc &r) { rows(r, 1); }, u"5", "header, three blank lines and a row"},
-        {[](UReportDoc &r) { rows(r, 7); }, u"11 1",
-         "the last line of a page stays free, the next page has its header"},
-        {[](UReportDoc &r) { rows(r, 16); }, u"11 11 6", "as counting lines gives it"},
-        {[](UReportDoc &r) {
-             r.SetHeading(QStringLiteral("one\r\ntwo\r\nthree"), 0, 1);
-             rows(r, 9);
-         },
-         u"9 9 9 9 8", "a heading of three lines counts twice: a page of ten lines is full"},
-        {[](UReportDoc &r) {
-             rows(r, 2);
-             r.LineFeed(30);
-             rows(r, 2);
-         },
-         u"6 6", "a long line feed is a page's end"},
-        {[](UReportDoc &r) {
-             rows(r, 1);
-             r.LineFeed(30);
-             r.Write(QStringLiteral("end"), 0);
-         },
-         u"36", "or within the page when nothing begins another one"},
-        {[](UReportDoc &r) {
-             r.SetHeaderFlag(false);
-             rows(r, 1);
-             r.NewPage(-1);
-             r.NewPage(-1);
-             rows(r, 1);
-         },
-         u"1 0 1", "a blank page in between"},
-        {[](UReportDoc &r) {
-             r.SetHeaderFlag(false);
-             rows(r, 1);
-             r.NewPage(-1);
-             r.NewPage(-1);
-         },
-         u"1", "blank pages at the end are not printed"},
-        {[](UReportDoc &r) {
-             rows(r, 1);
-             r.NewPage(-1);
-             r.NewPage(-1);
-         },
-         u"5 1 1", "pages with a header only are"},
-        {[](UReportDoc &r) {
-             for (int i = 0; i < 30; ++i) {
-                 r.Write(QStringLiteral("by hand\r\n"), 0);
-             }
-         },
-         u"12 12 6", "no page was begun: counting lines"},
-        {[](UReportDoc &r) {
-             for (int i = 0; i < 13; ++i) {
-                 r.Write(QStringLiteral("by hand\r\n"), 0);
-             }
-             rows(r, 1);
-         },
-         u"12 1 5", "what was written before the first page by counting"},
-        {[](UReportDoc &r) {
-             r.SetData(QStringLiteral("a\r\nb\r\n"));
-             rows(r, 1);
-         },
-         u"2 5", "a text and pages after it"},
-        {[](UReportDoc &r) {
-             r.SetData(QStringLiteral("a\r\nb"));
-             rows(r, 1);
-         },
-         u"6", "a page that begins within a line begins nowhere"},
-        {[](UReportDoc &r) {
-             r.SetHeaderFlag(false);
-             r.FixPage(1, 80);
-             rows(r, 3);
-         },
-         u"1 0 1 0 1", "one line a page: a line that is ended begins the next one, and the next line another"},
-        {[](UReportDoc &r) {
-             r.FixPage(1, 80);
-             rows(r, 2);
-         },
-         u"5 1 5 1", "a header that is longer than a page: no page is run out"},
-        {[](UReportDoc &r) {
-             rows(r, 3);
-             r.FixPage(20, 80);
-             rows(r, 20);
-         },
-         u"19 12", "more lines a page from the middle of one on"},
-        {[](UReportDoc &r) {
-             r.WriteLine(QStringLiteral("row"), -1, -1, 0);
-             r.LineFeed(-5);
-             r.WriteLine(QStringLiteral("row"), -1, 1, 0);
-         },
-         u"5 1 5", "counts below 0 begin pages"},
-    };
-    for (const Row &row : table) {
+    for (const Writing &writing : writings) {
         UReportDoc other;
         other.FixPage(12, 80);
         other.SetHeaderFlag(true);
-        row.write(other);
-        EXPECT_EQ(linesOf(other), QString::fromUtf16(row.lines)) << row.reason;
+        writing.write(other);
+        EXPECT_EQ(linesOf(other), QString::fromUtf16(writing.lines)) << writing.reason;
     }
 }
 
@@ -214,7 +215,7 @@ TEST_F(UReportDocPages, ATextIsReadByItsHeadersInAnyLanguage)
         const QString text = header(1) + QStringLiteral("a\r\nPage: 2\r\n") + header(9) + QStringLiteral("b\r\n");
         report.SetData(text);
         EXPECT_EQ(report.GetPageStarts(), std::vector<qint64>({0, text.indexOf(header(9))}))
-            << label.toStdString() << ": a number behind the label alone is no header";
+            << label.toStdString() << ": a number after the label alone is not a header";
     }
     report.SetData(QStringLiteral("a\r\n"));
     EXPECT_TRUE(report.GetPageStarts().empty());

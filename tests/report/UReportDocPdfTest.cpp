@@ -73,7 +73,7 @@ TEST(UReportDocPdf, ThePageOfTheReportIsTheOneThatIsWritten)
              report.LineFeed(35);
              report.SetData(QStringLiteral("one\r\ntwo\r\n"));
          },
-         usual, false, "lines that were counted are none of the text as it is now"},
+         usual, false, "lines that were counted are not those of the text as it is now"},
         {[](UReportDoc &report) {
              kareport::setDefaultPrinter({kareport::PrinterSource::BuiltIn, kareport::PaperSize::Letter, 300});
              report.SetPageSize();

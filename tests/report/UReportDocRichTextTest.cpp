@@ -111,7 +111,7 @@ TEST(UReportDocRichText, TheStyleChoosesTheParagraph)
         RichReport given;
         given.WriteRTFData(row.text, row.style);
         EXPECT_EQ(bodyOf(given), row.expected) << row.reason;
-        EXPECT_EQ(textOf(given), QString()) << row.reason << ": a piece given by itself is no report text";
+        EXPECT_EQ(textOf(given), QString()) << row.reason << ": a piece given by itself is not report text";
     }
 }
 
@@ -259,10 +259,10 @@ TEST(UReportDocRichText, AFormatStringIsCutDownToItsParagraph)
         {u"{\\viewkind a}b\\viewkind c}", true, u"\\viewkind a", "the first paragraph, up to the first brace"},
         {u"{\\viewkind{a}}", true, u"\\viewkind{a", "an opening brace is not counted"},
         {u"}}\\viewkind4 a}", true, u"\\viewkind4 a", "braces in front do not end it"},
-        {u"\\viewkind4 x}", false, u"\\viewkind4 x}", "it stands at the very beginning"},
+        {u"\\viewkind4 x}", false, u"\\viewkind4 x}", "it is at the very beginning"},
         {u"\\viewkind4 x}{\\viewkind4 y}", false, u"\\viewkind4 x}{\\viewkind4 y}", "only the first one counts"},
-        {u"{\\viewkind4 x", false, u"{\\viewkind4 x", "no brace behind it"},
-        {u"{a}\\viewkind4 x", false, u"{a}\\viewkind4 x", "the only brace stands in front"},
+        {u"{\\viewkind4 x", false, u"{\\viewkind4 x", "no brace after it"},
+        {u"{a}\\viewkind4 x", false, u"{a}\\viewkind4 x", "the only brace is in front"},
         {u"{\\rtf1 x}", false, u"{\\rtf1 x}", "no paragraph"},
         {u"{\\VIEWKIND4 x}", false, u"{\\VIEWKIND4 x}", "in small letters only"},
         {u"", false, u"", "empty"},

@@ -177,7 +177,7 @@ TEST(UReportDocSaveDialog, TheKindsAreTranslated)
     EXPECT_EQ(dialog.requests.back().filter, QStringLiteral("Berichte|*.rep|All Files (*.*)|*.*||"));
 }
 
-TEST(UReportDocSaveDialog, ANameThatBeginsWithTheExtensionIsNoRichText)
+TEST(UReportDocSaveDialog, ANameThatBeginsWithTheExtensionIsNotRichText)
 {
     const FixedSurroundings surroundings;
     const AnsweredDialog dialog(std::nullopt);

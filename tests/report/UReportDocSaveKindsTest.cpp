@@ -45,7 +45,7 @@ TEST(UReportDocSaveKinds, TheNamesEndSaysWhatIsWritten)
         {"x.PDF", pdf, "in any case"},
         {"x.pdf.pdf", text, "the first one is not at the end"},
         {"x.rtf.pdf", pdf, "the rich-text one is not at the end"},
-        {"x.pdf ", text, "a blank behind it"},
+        {"x.pdf ", text, "a blank after it"},
     };
     for (const Row &row : rows) {
         for (const bool modified : {true, false}) {
@@ -79,11 +79,11 @@ TEST(UReportDocSaveKinds, AnImpossibleTargetFailsForEveryKind)
         const QString inTheWay = QStringLiteral("folder") + extension;
         ASSERT_TRUE(QDir().mkdir(folder.filePath(inTheWay)));
         putFile(folder.filePath(QStringLiteral("file")), "earlier");
-        EXPECT_FALSE(report->OnSaveDocument(folder.filePath(inTheWay))) << "a folder stands there";
+        EXPECT_FALSE(report->OnSaveDocument(folder.filePath(inTheWay))) << "a folder has the name";
         EXPECT_FALSE(report->OnSaveDocument(folder.filePath(QStringLiteral("missing/a") + extension)))
             << "the folder does not exist";
         EXPECT_FALSE(report->OnSaveDocument(folder.filePath(QStringLiteral("file/a") + extension)))
-            << "a file is no folder";
+            << "a file is not a folder";
         EXPECT_TRUE(report->IsModified()) << extension.toStdString();
         EXPECT_EQ(namesIn(folder), (QStringList{QStringLiteral("file"), inTheWay}));
         EXPECT_EQ(contentOf(folder.filePath(QStringLiteral("file"))), "earlier");

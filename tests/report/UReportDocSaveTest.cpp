@@ -83,9 +83,9 @@ TEST(UReportDocSave, AFailedSaveKeepsTheModifiedFlagAndTheEarlierFile)
         const char *reason;
     };
     const Row rows[] = {
-        {folder.filePath(QStringLiteral("folder")), "a folder stands there"},
+        {folder.filePath(QStringLiteral("folder")), "a folder has the name"},
         {folder.filePath(QStringLiteral("missing/a.rep")), "the folder does not exist"},
-        {earlier + QStringLiteral("/a.rep"), "a file is no folder"},
+        {earlier + QStringLiteral("/a.rep"), "a file is not a folder"},
         {QString(), "no name at all"},
     };
     for (const Row &row : rows) {

@@ -68,7 +68,7 @@ TEST(UReportDocSaveView, TheFirstViewOfTheReportIsTheOneThatIsSaved)
     auto *first = showIn<WatchingView>(pane, report);
     auto *second = showIn<WatchingView>(pane, report);
     EXPECT_TRUE(report.OnSaveDocument(path));
-    EXPECT_EQ(first->streams, 1) << "other views are passed over";
+    EXPECT_EQ(first->streams, 1) << "other views are skipped";
     EXPECT_EQ(second->streams, 0);
     EXPECT_EQ(first->updates, 1);
     EXPECT_EQ(second->updates, 1) << "all views are updated, once";

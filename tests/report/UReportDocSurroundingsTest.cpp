@@ -83,7 +83,7 @@ TEST(UReportDocSurroundings, WithoutAnyThoseOfTheProgramHoldAgain)
     EXPECT_EQ(report.GetPageSize(), QSize(4961, 7016)) << "A4 upright with 600 dots per inch";
 }
 
-TEST(UReportDocSurroundings, AReportThatIsMadeWithThemAsksNobody)
+TEST(UReportDocSurroundings, AReportThatIsMadeWithThemAsksForNothing)
 {
     const FixedSurroundings surroundings;
     WriteProfileString(QString(), printHashEntry, QStringLiteral("1"));

@@ -158,7 +158,7 @@ TEST(UReportDocTemplate, ATableOrBlockThatCannotBeLoadedFailsTheWhole)
         {"", "Site", true, "with a block"},
         {"points", "SITE", true, "with both, in any case"},
         {"Unknown", "", false, "no such table"},
-        {"Site", "", false, "a block is no table"},
+        {"Site", "", false, "a block is not a table"},
         {"Lost", "", false, "a table without its dictionary"},
         {"", "Unknown", false, "no such block"},
         {"", "Lost", false, "a block without its dictionary"},

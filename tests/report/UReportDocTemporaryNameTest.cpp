@@ -29,7 +29,7 @@ TEST(UReportDocTemporaryName, NamesWithoutAnOwnStemAreNumberedTogether)
     const UReportDoc other;
     EXPECT_EQ(other.GetCurrentReportFileName(), folder.at(QStringLiteral("Report$$$ 4.rep"))) << "another report";
     EXPECT_EQ(nameFor(QStringLiteral("C:\\x\\Survey.rep")), folder.at(QStringLiteral("Report$$$ 5.rep")))
-        << "a name of three letters behind its point leaves nothing of itself";
+        << "a name of three letters after its point leaves nothing of itself";
 }
 
 TEST(UReportDocTemporaryName, AReportsNameGivesTheStem)
@@ -45,7 +45,7 @@ TEST(UReportDocTemporaryName, AReportsNameGivesTheStem)
         {QStringLiteral("/x/y/Survey"), QStringLiteral("Survey"), "folders with the other separator"},
         {QStringLiteral("C:\\x/Survey"), QStringLiteral("Survey"), "both separators, the last one counts"},
         {QStringLiteral("/x\\Survey"), QStringLiteral("Survey"), "both separators, the last one counts"},
-        {QStringLiteral("/x.y/Survey"), QStringLiteral("Survey"), "a point in a folder is none of the name"},
+        {QStringLiteral("/x.y/Survey"), QStringLiteral("Survey"), "a point in a folder is not part of the name"},
         {QStringLiteral("Survey.rep"), QStringLiteral("Report$$$"), "an extension of three letters leaves nothing"},
         {QStringLiteral("Survey.c"), QStringLiteral("Report$$$"), "nor does a shorter one"},
         {QStringLiteral("Survey."), QStringLiteral("Report$$$"), "nor a point at the end"},
@@ -75,7 +75,7 @@ TEST(UReportDocTemporaryName, AReportThatIsMadeWithANameHasItAsStem)
     EXPECT_EQ(report.GetCurrentReportFileName(), folder.at(QStringLiteral("Traverse.rep")));
     EXPECT_EQ(nameFor(QStringLiteral("Traverse 2")), folder.at(QStringLiteral("Traverse 2.rep")));
     EXPECT_EQ(report.GetCurrentReportFileName(), folder.at(QStringLiteral("Traverse 3.rep")))
-        << "a number that another name has taken is passed over";
+        << "a number that another name has taken is skipped";
 }
 
 TEST(UReportDocTemporaryName, TheFileSystemIsNotAsked)

@@ -130,7 +130,7 @@ TEST(UReportDocTextObject, TheTextIsMadeOfTheBytesOfTheViewTwoByTwo)
     }
 }
 
-TEST(UReportDocTextObject, TheTextIsBrokenBehindABlankWhereItHas80Characters)
+TEST(UReportDocTextObject, TheTextIsBrokenAfterABlankWhereItHas80Characters)
 {
     const QString x77(77, u'x');
     const QString x78(78, u'x');
@@ -142,17 +142,17 @@ TEST(UReportDocTextObject, TheTextIsBrokenBehindABlankWhereItHas80Characters)
         const char *reason;
     };
     const Row rows[] = {
-        {x78 + QStringLiteral(" ab"), x78 + QStringLiteral(" \nab"), "the 80th character behind a blank"},
-        {x77 + QStringLiteral(" ab"), x77 + QStringLiteral(" ab"), "the 79th is early, the 80th stands in a word"},
+        {x78 + QStringLiteral(" ab"), x78 + QStringLiteral(" \nab"), "the 80th character after a blank"},
+        {x77 + QStringLiteral(" ab"), x77 + QStringLiteral(" ab"), "the 79th is early, the 80th is in a word"},
         {x77 + QStringLiteral(" ab c"), x77 + QStringLiteral(" ab \nc"), "a word is not broken"},
         {x77 + QStringLiteral("x  ab"), x78 + QStringLiteral("  \nab"), "blanks stay on their line"},
         {x78 + QStringLiteral("\r\nab"), x78 + QStringLiteral("  \nab"), "a line end of the text is two blanks"},
         {x100 + QStringLiteral(" ab"), x100 + QStringLiteral(" \nab"), "a word longer than a line"},
         {x100 + x100, x100 + x100, "no blank, no break"},
         {x100 + QStringLiteral(" a") + x77 + QStringLiteral("x b"),
-         x100 + QStringLiteral(" \na") + x77 + QStringLiteral("x \nb"), "the next line is counted behind its first"},
+         x100 + QStringLiteral(" \na") + x77 + QStringLiteral("x \nb"), "the next line is counted after its first"},
         {x100 + QStringLiteral(" a") + x77 + QStringLiteral(" b"),
-         x100 + QStringLiteral(" \na") + x77 + QStringLiteral(" b"), "the next line is counted behind its first"},
+         x100 + QStringLiteral(" \na") + x77 + QStringLiteral(" b"), "the next line is counted after its first"},
         {QString(90, u' ') + QStringLiteral("a"), QString(90, u' ') + QStringLiteral("\na"), "blanks in front"},
     };
     for (const Row &row : rows) {
@@ -216,7 +216,7 @@ TEST(UReportDocTextObject, TheLastViewOfTheReportThatHasATextCounts)
     EXPECT_EQ(edited.receipt.texts.back().second, QStringLiteral("second"));
     showIn<FailingView>(pane, *edited.report);
     edited.report->SaveText();
-    EXPECT_EQ(edited.receipt.texts.back().second, QStringLiteral("second")) << "a text that is cut off is none";
+    EXPECT_EQ(edited.receipt.texts.back().second, QStringLiteral("second")) << "a text that is cut off is not sent";
     EXPECT_EQ(edited.receipt.texts.size(), 3U) << "one text each time";
 }
 

@@ -291,7 +291,7 @@ TEST(UReportDocText, ATextThatWasMadeElsewhereIsTakenOver)
     EXPECT_EQ(loaded.text.view().toString(), QStringLiteral("before\r\n"));
 }
 
-TEST(UReportDocText, LineFeedsInATextAreCountedWhereverTheyStand)
+TEST(UReportDocText, LineFeedsInATextAreCountedWhereverTheyAre)
 {
     for (qsizetype length = 0; length < 20; ++length) {
         for (qsizetype first = 0; first < length; ++first) {

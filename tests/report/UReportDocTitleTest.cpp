@@ -72,7 +72,7 @@ TEST(UReportDocTitle, TheFirstFreeNumberFrom2IsTaken)
          QString::fromUtf8("\xC3\xBC 2"),
          "case does not matter beyond ASCII"},
         {{n}, n, n, "the only pane left of several shows its number: it is another caption", 2},
-        {{n, n}, n, n, "likewise of two panes that stand there", 1},
+        {{n, n}, n, n, "likewise of two panes that are open", 1},
         {{n2, n2}, n2, n2, "or of a document that has a number already", 1},
         {{n}, QStringLiteral("N:1"), QStringLiteral("N:1 2"), "a caption with its number counts as it is shown", 1},
         {{n, n}, QStringLiteral("n:2"), QStringLiteral("n:2 2"), "of the second pane as well", 1},
@@ -114,7 +114,7 @@ TEST(UReportDocTitle, AReportsOwnPanesDoNotCount)
     EXPECT_EQ(report->GetTitle(), QStringLiteral("N 2")) << "and the same again";
 }
 
-TEST(UReportDocTitle, AReportThatStandsInNumberedPanesLeavesItsTitleToOthers)
+TEST(UReportDocTitle, AReportInNumberedPanesLeavesItsTitleToOthers)
 {
     const FixedSurroundings surroundings;
     ReportApplication application;
@@ -166,7 +166,7 @@ TEST(UReportDocTitle, TheWindowTextReachesTheFirstViewOnlyAndOnlyAReportView)
     const QString text = QStringLiteral("text");
     UReportDoc report;
     report.SetAutoDelete(false);
-    report.SetWindowTextW(text); // without a view there is nobody to tell
+    report.SetWindowTextW(text); // without a view there is nothing to tell
     {
         CViewPane plain;
         CViewPane shows;

@@ -4,7 +4,7 @@
 
 #include <QTabBar>
 
-/// The tab of a pane in the rows of tabs of a frame: the row and its number. Null where the pane is no tab.
+/// The tab of a pane in the rows of tabs of a frame: the row and its number. Null where the pane is not a tab.
 struct PaneTab
 {
     QTabBar *bar = nullptr;

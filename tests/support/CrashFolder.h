@@ -16,7 +16,7 @@ public:
     /// The folders of programs in it.
     QStringList programs() const;
     QStringList files(const QString &program) const;
-    /// Ends a program as a crash does: its files stay, its lock is that of nobody.
+    /// Ends a program as a crash does: its files stay, its lock has no owner.
     void crash(std::unique_ptr<kareport::Recovery> recovery) const;
 
 private:

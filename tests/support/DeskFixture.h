@@ -18,7 +18,7 @@
 
 #include <vector>
 
-/// The desktop program with preferences of its own, and somebody who answers its questions.
+/// The desktop program with preferences of its own, and something that answers its questions.
 class Desk
 {
 public:

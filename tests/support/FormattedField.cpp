@@ -17,5 +17,5 @@ QString FormattedField::of(int kind, const void *value) const
     out.append(u"before");
     kareport::FieldFormatter(field).append(out, used, static_cast<kareport::ValueKind>(kind), value, suffix);
     return out.from(0).startsWith(u"before") ? out.from(6).toString()
-                                             : QStringLiteral("what stood there before was changed");
+                                             : QStringLiteral("what was there before was changed");
 }

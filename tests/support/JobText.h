@@ -6,7 +6,7 @@
 
 #include <gtest/gtest.h>
 
-/// Jobs that are read from a text, as if it stood in a file of the folder "jobs".
+/// Jobs that are read from a text, as if it were in a file of the folder "jobs".
 namespace jobtext
 {
 

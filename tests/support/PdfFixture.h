@@ -23,7 +23,7 @@ public:
     QString path() const { return folder_.path(); }
     /// Puts a copy of a font file in, under another name.
     FontFolder &with(const QString &name, const QString &font);
-    /// Puts a file in that is no font.
+    /// Puts a file in that is not a font.
     FontFolder &withText(const QString &name, const QByteArray &text);
 
 private:

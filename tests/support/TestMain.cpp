@@ -8,7 +8,7 @@
 
 int main(int argc, char **argv)
 {
-    // Pages are measured with fonts, windows are not shown, and nobody's own preferences are read or written.
+    // Pages are measured with fonts, windows are not shown, and no user's own preferences are read or written.
     qputenv("QT_QPA_PLATFORM", "offscreen");
     const QApplication application(argc, argv);
     kareport::setProfileStore(kareport::makeMemoryProfile());

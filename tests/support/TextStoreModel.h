@@ -157,7 +157,7 @@ private:
     std::mt19937_64 random_;
 };
 
-/// The sequence that some bytes stand for, for a search that is led by what the code does.
+/// The sequence that some bytes mean, for a search that is led by what the code does.
 std::vector<Step> stepsOf(const std::uint8_t *data, std::size_t size);
 
 } // namespace textstore

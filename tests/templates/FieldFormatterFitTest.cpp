@@ -48,7 +48,7 @@ constexpr FitRow fitRows[] = {
     {"c", 4, "AB", " AB ", " AB ", "a small c"},
     {"", 4, "AB", "  AB", "  AB", "no alignment is right"},
     {"X", 4, "AB", "  AB", "  AB", "another letter is right"},
-    {"CENTER", 4, "AB", "  AB", "  AB", "a word is no letter"},
+    {"CENTER", 4, "AB", "  AB", "  AB", "a word is not a letter"},
 };
 
 TEST(FieldFormatterFit, FitsATextToItsColumn)
@@ -69,9 +69,9 @@ TEST(FieldFormatterFit, CentresEveryTextInItsColumn)
             const int missing = width - length;
             // Half of the blanks before, at least one; the odd one after.
             const int before = missing <= 0 ? 0 : missing == 1 ? 1 : missing / 2;
-            const int behind = missing <= 0 ? 0 : missing == 1 ? 1 : missing - missing / 2;
+            const int after = missing <= 0 ? 0 : missing == 1 ? 1 : missing - missing / 2;
             const QString text(length, u'x');
-            EXPECT_EQ(FormattedField(2, width, 0, "C").of(text), QString(before, u' ') + text + QString(behind, u' '))
+            EXPECT_EQ(FormattedField(2, width, 0, "C").of(text), QString(before, u' ') + text + QString(after, u' '))
                 << length << " in " << width;
         }
     }

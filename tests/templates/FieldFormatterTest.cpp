@@ -31,7 +31,7 @@ constexpr Row rows[] = {
     {1, 8, 1, -2.5, "  -2.500", "  -2.500", "DOUBLE, negative"},
     {1, 8, 1, 0, "   0.000", "        ", "DOUBLE, zero"},
     {1, 8, 1, -0.0, "  -0.000", "        ", "DOUBLE, negative zero is exactly zero"},
-    {1, 8, 1, -0.0001, "  -0.000", "  -0.000", "DOUBLE, rounded to zero it keeps its sign and is no zero"},
+    {1, 8, 1, -0.0001, "  -0.000", "  -0.000", "DOUBLE, rounded to zero it keeps its sign and is not a zero"},
     {1, 4, 1, 12345.0625, "12345.062", "12345.062", "DOUBLE, wider than its column; a tie goes to the even digit"},
     {1, 0, 1, 2.5, "2.500", "2.500", "DOUBLE, no width"},
     {1, -8, 1, 2.5, "2.500   ", "2.500   ", "DOUBLE, a negative width fills on the right"},
@@ -57,7 +57,7 @@ constexpr Row rows[] = {
     {5, 10, 1, -12.5, "   -12.500", "   -12.500", "COORDINATE, negative"},
     {5, 8, 1, 0, "   0.000", "        ", "COORDINATE of 0 with zeros as blanks is as many blanks as it is wide"},
     {5, 8, 1, -0.0, "   0.000", "        ", "COORDINATE, a length of zeros has no sign"},
-    {5, 8, 1, -0.0001, "   0.000", "   0.000", "COORDINATE, rounded to zero it is no zero"},
+    {5, 8, 1, -0.0001, "   0.000", "   0.000", "COORDINATE, rounded to zero it is not a zero"},
     {5, 4, 1, 123456.5, "123456.500", "123456.500", "COORDINATE, wider than its column"},
     {5, -10, 1, 12.5, "12.500    ", "12.500    ", "COORDINATE, a negative width"},
     {5, 4, 1, nan, "    ", "    ", "COORDINATE, not a number"},
@@ -98,7 +98,7 @@ constexpr Row rows[] = {
     {21, 8, 1, -infinity, "    -inf", "    -inf", "type 21: infinite as it is"},
     {21, 8, 1, nan, "     nan", "     nan", "type 21: not a number as it is"},
     {21, 2, 1, infinity, "inf", "inf", "type 21: wider than its column"},
-    // a thickness is held in hundredths, bit 15 stands for "by layer"
+    // a thickness is held in hundredths, bit 15 means "by layer"
     {22, 8, 2, 250, "    2.50", "    2.50", "THICKNESS of 250"},
     {22, 8, 2, 0, "    0.00", "    0.00", "THICKNESS of 0, never blank"},
     {22, 8, 2, -1, " ByLayer", " ByLayer", "THICKNESS of -1"},

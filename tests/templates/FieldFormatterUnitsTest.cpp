@@ -84,7 +84,7 @@ TEST(FieldFormatterUnits, BearingsFollowTheSettings)
     bearing.settings.angleMarks = {'d', 'm', 's'};
     EXPECT_EQ(bearing.of(0.5), QStringLiteral("N 28d38m52s E"));
     bearing.settings.angleMarks = {'\xBA', '\0', '\0'};
-    EXPECT_EQ(bearing.of(0.5), QStringLiteral("N 28º3852 E")) << "marks are Latin-1, the character 0 is none";
+    EXPECT_EQ(bearing.of(0.5), QStringLiteral("N 28º3852 E")) << "marks are Latin-1, the character 0 is not shown";
     bearing.settings.bearingStyle = 0;
     bearing.settings.bearingUnit = 1;
     bearing.settings.bearingDecimals = 4;

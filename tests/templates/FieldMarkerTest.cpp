@@ -25,7 +25,7 @@ constexpr MarkerRow markerRows[] = {
     {u"SUFFIX_+", FieldMarker::SuffixPlus, "capitals"},
     {u"Suffix_+", FieldMarker::SuffixPlus, "any case"},
     {u"", FieldMarker::None, "no name"},
-    {u"FILLER ", FieldMarker::None, "a blank behind"},
+    {u"FILLER ", FieldMarker::None, "a blank after it"},
     {u"FILLERS", FieldMarker::None, "a longer name"},
     {u"SUFFIX_", FieldMarker::None, "no style"},
     {u"SUFFIX_L", FieldMarker::None, "another letter"},

@@ -3,6 +3,7 @@
 #include "TemplateCheck.h"
 #include "TemplateFile.h"
 #include "TemplateNames.h"
+#include "TestSize.h"
 
 #include <gtest/gtest.h>
 
@@ -11,7 +12,8 @@
 namespace
 {
 
-constexpr int many = 100000;
+/// So many that a walk over the text for each would take minutes.
+const int many = testSize(40'000, 100'000);
 
 QByteArray templateOf(const QByteArray &body)
 {
@@ -19,9 +21,9 @@ QByteArray templateOf(const QByteArray &body)
            "<Options><Separator>|</Separator></Options></ReportTemplate>";
 }
 
-QByteArray numbered(const char *before, int number, const char *behind)
+QByteArray numbered(const char *before, int number, const char *after)
 {
-    return before + QByteArray::number(number) + behind;
+    return before + QByteArray::number(number) + after;
 }
 
 /// A table whose fields "V0", "V1" and so on end with the short closing tag and the five characters that go with it.
@@ -72,7 +74,7 @@ TEST(HostileTemplate, JoinsManyFieldsWithManyVariables)
     }
 }
 
-TEST(HostileTemplate, ReadsNothingBehindManyTagsThatNobodyCloses)
+TEST(HostileTemplate, ReadsNothingAfterManyTagsThatAreNotClosed)
 {
     for (const char *tag : {"<Field>", "<Table>", "<OutputList>", "<Name>", "<Tables>", "<Options>", "</", "<"}) {
         QByteArray tags;
@@ -102,7 +104,7 @@ TEST(HostileTemplate, ReadsTheFirstOfManyTagsThatAreClosedOnce)
     EXPECT_EQ(loaded.tpl.GetTable(QStringLiteral("X"))->Fields[0].VariableName, QStringLiteral("A"));
 }
 
-TEST(HostileTemplate, TemplatesThatNobodyClosesAreNone)
+TEST(HostileTemplate, TemplatesThatAreNotClosedAreNotRead)
 {
     QByteArray open;
     for (int i = 0; i < 10000; ++i) {
@@ -191,7 +193,7 @@ TEST(HostileTemplate, ChecksManyFieldsWithARemarkOnEach)
 
 TEST(HostileTemplate, ChecksManyRemarksInOneLongLine)
 {
-    constexpr int count = many;
+    const int count = many;
     QByteArray bytes = templateOf(tableOfShortFields(count) + dictionaryOf(1));
     bytes.replace("\n", "");
     bytes.replace("<Title>Title", "<Title>\xF0\x9F\x98\x80"); // places are counted in characters
@@ -244,7 +246,7 @@ TEST(HostileTemplate, ReadsAndChecksManyUsesOfADictionaryWithALongName)
     EXPECT_LT(characters, 30000 * 200) << "long names are cut short";
 }
 
-TEST(HostileTemplate, ChecksManyTagsThatAreNone)
+TEST(HostileTemplate, ChecksManyTagsThatAreNotValid)
 {
     QByteArray tags;
     for (int i = 0; i < 10000; ++i) {
@@ -257,7 +259,7 @@ TEST(HostileTemplate, ChecksManyTagsThatAreNone)
         comments += "<!-- ";
     }
     EXPECT_EQ(kareport::checkTemplates(kareport::TemplateFile(templateOf(comments))).size(), 5U)
-        << "the tags behind the comments, which nobody ends";
+        << "the tags after the comments, which have no end";
 }
 
 } // namespace

@@ -23,7 +23,7 @@ std::vector<qsizetype> sources(const ScanText &text)
 
 using Sources = std::vector<qsizetype>;
 
-TEST(ScanText, StandsWhereItIsWhenItIsATextOfItsOwn)
+TEST(ScanText, StaysWhereItIsWhenItIsATextOfItsOwn)
 {
     const ScanText text(QStringLiteral("abc"));
     EXPECT_EQ(text.text(), QStringLiteral("abc"));
@@ -86,7 +86,7 @@ TEST(ScanText, SliceKeepsThePlaces)
         {2, 3, "cde", {12, 13, 14, 15}, "in the first piece"},
         {4, 4, "efgh", {14, 15, 20, 21, 22}, "across the joint"},
         {6, 2, "gh", {20, 21, 22}, "from the joint on"},
-        {0, 6, "abcdef", {10, 11, 12, 13, 14, 15, 16}, "up to the joint: the end stands behind the last character"},
+        {0, 6, "abcdef", {10, 11, 12, 13, 14, 15, 16}, "up to the joint: the end is after the last character"},
         {9, 1, "j", {23, 24}, "the last character"},
         {10, 0, "", {24}, "nothing, at the end"},
     };

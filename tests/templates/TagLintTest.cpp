@@ -27,16 +27,16 @@ constexpr Row rows[] = {
     {u"<Name>A</Name>", Kind::NotATag, -1, u"", "two tags"},
     {u"<name>A</NAME>", Kind::NotATag, -1, u"", "two tags in any case"},
     {u"<Name>A</>", Kind::NotATag, -1, u"", "the short closing tag"},
-    {u"a < b, b > a, 1 <2> 3", Kind::NotATag, -1, u"", "signs that are no tags"},
+    {u"a < b, b > a, 1 <2> 3", Kind::NotATag, -1, u"", "signs that are not tags"},
     {u"<?xml version=\"1.0\"?>", Kind::NotATag, -1, u"", "a declaration"},
     {u"<Templates a=\"1\">", Kind::NotATag, -1, u"", "an element of another name"},
     {u"<Names >", Kind::NotATag, -1, u"", "a longer name"},
     {u"<VariableName >", Kind::NotATag, 0, u"<VariableName >", "the longest of two names that fit"},
-    {u"x<Name >A</Name>", Kind::NotATag, 1, u"<Name >", "a blank behind the name"},
+    {u"x<Name >A</Name>", Kind::NotATag, 1, u"<Name >", "a blank after the name"},
     {u"< Name>A</Name>", Kind::NotATag, 0, u"< Name>", "a blank before the name"},
     {u"<Name a=\"1\">A</Name>", Kind::NotATag, 0, u"<Name a=\"1\">", "an attribute"},
     {u"<Name>A</Name >", Kind::NotATag, 7, u"</Name >", "a blank in the closing tag"},
-    {u"<Name>A</ Name>", Kind::NotATag, 7, u"</ Name>", "a blank behind the slash"},
+    {u"<Name>A</ Name>", Kind::NotATag, 7, u"</ Name>", "a blank after the slash"},
     {u"<Name>A< /Name>", Kind::NotATag, 7, u"< /Name>", "a blank before the slash"},
     {u"<Name/>", Kind::NotATag, 0, u"<Name/>", "an element without content, as a parser would read it"},
     {u"<name />", Kind::NotATag, 0, u"<name />", "the same with a blank, in any case"},
@@ -48,16 +48,16 @@ constexpr Row rows[] = {
     {u"<!-- a comment -->", Kind::InComment, -1, u"", "a comment without tags"},
     {u"<!-- <Name> -->", Kind::InComment, 5, u"<Name>", "a tag in a comment"},
     {u"<!-- </Name> -->", Kind::InComment, 5, u"</Name>", "a closing tag in a comment"},
-    {u"<!-- <Name a=\"1\"> <b> -->", Kind::InComment, -1, u"", "what is no tag is harmless in a comment"},
-    {u"<!-- --><Name>", Kind::InComment, -1, u"", "a tag behind a comment"},
+    {u"<!-- <Name a=\"1\"> <b> -->", Kind::InComment, -1, u"", "what is not a tag is harmless in a comment"},
+    {u"<!-- --><Name>", Kind::InComment, -1, u"", "a tag after a comment"},
     {u"<!-- <!-- --><Name>", Kind::InComment, -1, u"", "comments do not nest"},
     {u"<!-- <Title>", Kind::InComment, 5, u"<Title>", "a comment without an end"},
-    {u"<!-- --> <Name >", Kind::NotATag, 9, u"<Name >", "a blank in a tag behind a comment"},
+    {u"<!-- --> <Name >", Kind::NotATag, 9, u"<Name >", "a blank in a tag after a comment"},
     {u"<Label abcdefghijklmnopqrstuvwxyz0123456789abcdef>", Kind::NotATag, 0,
      u"<Label abcdefghijklmnopqrstuvwxyz01234567…>", "a long tag is quoted by its first 40 characters"},
 };
 
-TEST(TagLint, FindsWhatLooksLikeATagAndIsNone)
+TEST(TagLint, FindsWhatLooksLikeATagAndIsNotOne)
 {
     for (const Row &row : rows) {
         const auto remarks = findIgnoredTags(ScanText(QString::fromUtf16(row.text)));

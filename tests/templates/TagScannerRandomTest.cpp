@@ -1,5 +1,6 @@
 #include "PrintQt.h"
 #include "TagScanner.h"
+#include "TestSize.h"
 
 #include <gtest/gtest.h>
 
@@ -100,7 +101,7 @@ std::vector<qsizetype> counted(qsizetype size)
     return numbers;
 }
 
-constexpr int texts = 40000;
+const int texts = testSize(12'000, 40'000);
 
 TEST(TagScannerRandom, CutsAsThePlainestScannerDoes)
 {

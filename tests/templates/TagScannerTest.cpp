@@ -42,9 +42,9 @@ constexpr Row rows[] = {
     {u"<Name >x</Name>", u"NAME", -1, u"", u"<Name >x</Name>", "a blank in the opening tag makes it no tag"},
     {u"< Name>x</Name>", u"NAME", -1, u"", u"< Name>x</Name>", "a blank in front of the name makes it no tag"},
     {u"<Name a=\"1\">x</Name>", u"NAME", -1, u"", u"<Name a=\"1\">x</Name>", "an attribute makes it no tag"},
-    {u"<Name/>", u"NAME", -1, u"", u"<Name/>", "a self-closing tag is none"},
+    {u"<Name/>", u"NAME", -1, u"", u"<Name/>", "a self-closing tag is not read"},
     {u"<Name>x</Name >", u"NAME", -1, u"", u"<Name>x</Name >", "a blank in the closing tag makes it no tag"},
-    {u"<Name>x</ Name>", u"NAME", -1, u"", u"<Name>x</ Name>", "a blank behind the slash makes it no tag"},
+    {u"<Name>x</ Name>", u"NAME", -1, u"", u"<Name>x</ Name>", "a blank after the slash makes it no tag"},
     {u"<Names>x</Names>", u"NAME", -1, u"", u"<Names>x</Names>", "a longer name is another element"},
     {u"<VariableName>x</VariableName>", u"NAME", -1, u"", u"<VariableName>x</VariableName>",
      "a name that ends with the searched one is another element"},
@@ -55,7 +55,7 @@ constexpr Row rows[] = {
     {u"<Name>x</Nam", u"NAME", -1, u"", u"<Name>x</Nam", "cut off in the closing tag"},
     {u"<Name>x</", u"NAME", -1, u"", u"<Name>x</", "cut off in the short closing tag"},
     {u"</Name><Name>x</Name>", u"NAME", -1, u"", u"</Name><Name>x</Name>",
-     "the first closing tag of the whole text counts, and it stands before the opening tag"},
+     "the first closing tag of the whole text counts, and it is before the opening tag"},
     {u"</Name><Name>x</>", u"NAME", -1, u"", u"</Name><Name>x</>",
      "a full closing tag anywhere rules the short one out"},
     {u"<Name>a<Name>b</Name>c</Name>", u"NAME", 0, u"a<Name>b", u"c</Name>", "nested: the first closing tag ends it"},
@@ -64,17 +64,18 @@ constexpr Row rows[] = {
     {u"<Name>x</>123", u"NAME", 0, u"x", u"", "fewer than 4 characters are left to go with it"},
     {u"<Name>x</>1234", u"NAME", 0, u"x", u"", "exactly 4 characters are left to go with it"},
     {u"<Name>x</><Title>y</Title>", u"NAME", 0, u"x", u"le>y</Title>", "what is dropped can be a tag's begin"},
-    {u"</><Name>x</>", u"NAME", 3, u"x", u"</>", "a short closing tag before the opening tag is passed over"},
+    {u"</><Name>x</>", u"NAME", 3, u"x", u"</>", "a short closing tag before the opening tag is skipped"},
     {u"<Name></>1234x", u"NAME", 0, u"", u"x", "an empty element with the short closing tag"},
-    {u"<Name>x</>y</Name>z", u"NAME", 0, u"x</>y", u"z", "a full closing tag behind wins over a short one before"},
+    {u"<Name>x</>y</Name>z", u"NAME", 0, u"x</>y", u"z",
+     "a full closing tag further on wins over a short one before it"},
     {u"<Name>a<Title>b</></Name>", u"TITLE", 7, u"b", u"<Name>ae>",
      "the dropped characters are counted, not looked at"},
-    {u"<<Name>x</Name>", u"NAME", 1, u"x", u"<", "a tag directly behind another \"<\""},
+    {u"<<Name>x</Name>", u"NAME", 1, u"x", u"<", "a tag directly after another \"<\""},
     {u"<Name>x<</Name>", u"NAME", 0, u"x<", u"", "a value that ends with \"<\""},
     {u"<Na<Name>me>x</Name>", u"NAME", 3, u"me>x", u"<Na", "a tag inside a torn tag"},
     {u"<TıTLE>x</TıTLE>", u"TITLE", 0, u"x", u"", "the dotless i is an I in capitals"},
     {u"<Uſe>x</uſE>", u"USE", 0, u"x", u"", "the long s is an S in capitals"},
-    {u"<Tİtle>x</Title>", u"TITLE", -1, u"", u"<Tİtle>x</Title>", "a capital I with a dot is none without"},
+    {u"<Tİtle>x</Title>", u"TITLE", -1, u"", u"<Tİtle>x</Title>", "a capital I with a dot is not one without"},
     {u"ßßß<Name>ß</Name>ß", u"NAME", 3, u"ß", u"ßßßß", "a sharp s stays one character in capitals"},
     {u"ŉǰΐ<Name>x</Name>", u"NAME", 3, u"x", u"ŉǰΐ", "no character grows in capitals and moves the positions"},
     {u"\U0001F600<Name>\U0001F600</Name>", u"NAME", 2, u"\U0001F600", u"\U0001F600",
@@ -146,14 +147,14 @@ struct SequenceRow
 constexpr SequenceRow sequenceRows[] = {
     {u"", u"", "nothing"},
     {u"<F>a</F>", u"a|", "one"},
-    {u"<F>a</F><F>b</F><f>c</f>", u"a|b|c|", "one behind the other"},
-    {u" <F>a</F> x <F>b</F> ", u"a|b|", "what stands between them is passed over"},
+    {u"<F>a</F><F>b</F><f>c</f>", u"a|b|c|", "one after the other"},
+    {u" <F>a</F> x <F>b</F> ", u"a|b|", "what is between them is skipped"},
     {u"<F>a</F><F></F><F>b</F>", u"a|", "an empty element ends the list"},
     {u"<F></F><F>b</F>", u"", "an empty element at the front ends it at once"},
     {u"<F> </F><F>b</F>", u" |b|", "a blank is not empty"},
-    {u"<F>a</F></F><F>b</F>", u"a|", "a closing tag too many stands before the next opening tag"},
+    {u"<F>a</F></F><F>b</F>", u"a|", "a closing tag too many is before the next opening tag"},
     {u"</F><F>a</F>", u"", "the same at the front"},
-    {u"<F>a<F>b</F>c</F><F>d</F>", u"a<F>b|", "nested: the rest of the outer one stands before the next"},
+    {u"<F>a<F>b</F>c</F><F>d</F>", u"a<F>b|", "nested: the rest of the outer one is before the next"},
     {u"<F>a</>1<F>b</>2<F>c</>", u"a|b|c|", "short closing tags, each with one character to go"},
     {u"<F>a</><F>b</>", u"a|", "the dropped character was the next tag's begin"},
     {u"<F>a</>1<F>b</F>", u"a</>1<F>b|", "a full closing tag at the end rules the short ones out"},
@@ -197,7 +198,7 @@ using Kind = ScanNote::Kind;
 
 constexpr NoteRow noteRows[] = {
     {u"x<F>a</F>", Kind::Unclosed, -1, u"", "nothing to say"},
-    {u"", Kind::Unclosed, -1, u"", "no element is no mistake"},
+    {u"", Kind::Unclosed, -1, u"", "no element is not a mistake"},
     {u"a<F>b", Kind::Unclosed, 1, u"", "at the opening tag that is not closed"},
     {u"</F><F>a</F>", Kind::ClosedBeforeOpen, 4, u"", "at the opening tag that is not read"},
     {u"<F>a<F>b</F>", Kind::RunsOn, 4, u"", "at the inner opening tag"},
@@ -205,7 +206,7 @@ constexpr NoteRow noteRows[] = {
     {u"<F>a</> <F>b</> ", Kind::ShortCloseDrops, -1, u"", "blanks are nothing that is missed"},
 };
 
-TEST(TagScanner, NotesWhatWasPassedOver)
+TEST(TagScanner, NotesWhatWasSkipped)
 {
     for (const NoteRow &row : noteRows) {
         const ScanText text(QString::fromUtf16(row.text));

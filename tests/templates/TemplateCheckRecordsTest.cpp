@@ -35,11 +35,11 @@ TEST(TemplateCheckRecords, RemarksOnVariables)
         {end,
          "<Variable>¦<ID>x9</ID><VariableName>R</VariableName><Type>TEXT</Type></Variable></VariableList>",
          {{"warning", "the identifier \"x9\" counts as 0: a whole number was expected"}},
-         "an identifier that is no number"},
+         "an identifier that is not a number"},
         {end,
          "<Variable>¦<ID>9.5</ID><VariableName>R</VariableName><Type>TEXT</Type></Variable></VariableList>",
          {{"warning", "the identifier \"9.5\" counts as 9: a whole number was expected"}},
-         "an identifier that is no whole number"},
+         "an identifier that is not a whole number"},
         {end,
          "<Variable>¦<ID>4294967297</ID><VariableName>R</VariableName><Type>TEXT</Type></Variable></VariableList>",
          {{"warning", "the identifier \"4294967297\" counts as 2147483647: a whole number was expected"}},
@@ -153,7 +153,7 @@ TEST(TemplateCheckRecords, RemarksOnFields)
     });
 }
 
-TEST(TemplateCheckRecords, APercentSignOfAValueIsQuotedAsItStands)
+TEST(TemplateCheckRecords, APercentSignOfAValueIsQuotedAsItIs)
 {
     const char *const inTable = "<Label>Point</Label><Format>8</Format>";
     expectAll({

@@ -29,7 +29,7 @@ TEST(TemplateCheck, SaysNothingAboutWhatIsReadAsItLooks)
          "nothing is cut out of the options, so a short closing tag drops nothing"},
         {"<Separator>|</Separator>", "<Separator>9</Separator>", {}, "the separator's code"},
         {"<Title>Stakeout</Title>", "<Title>a < b & c > d</Title>", {}, "signs that are neither tags nor entities"},
-        {"<Title>Stakeout</Title>", "<Title>Stakeout</>     ", {}, "a short closing tag with room behind it"},
+        {"<Title>Stakeout</Title>", "<Title>Stakeout</>     ", {}, "a short closing tag with room after it"},
         {"<Align>RIGHT</Align>", "<Align>center</Align>", {}, "a centred column"},
         {"<Label>North</Label><Format>12.3</Format>", "<Label>North</Label>", {}, "a column as wide as its label"},
         {"<Label>Point</Label><Format>8</Format>", "<Label>Point</Label><Format>5</Format>", {}, "a label that fits"},
@@ -41,7 +41,7 @@ TEST(TemplateCheck, SaysNothingAboutWhatIsReadAsItLooks)
     }
 }
 
-TEST(TemplateCheck, NameAndTitleMayStandBehindTheDictionaries)
+TEST(TemplateCheck, NameAndTitleMayComeAfterTheDictionaries)
 {
     QString text = cleanTemplate;
     const QString head = QStringLiteral("    <Name>STAKEOUT</Name>\n    <Title>Stakeout</Title>\n");
@@ -80,8 +80,8 @@ TEST(TemplateCheck, RemarksOnTags)
         {"<Label>Point</Label><Format>8</Format>",
          "<Label>Point</Label><Format>8</>¦123456",
          {{"warning", "\"123456\" is dropped with the short closing tag of <Format>"}},
-         "characters behind a short closing tag"},
-        {title, "<Title>Stakeout</>12345", {}, "behind the part that is read last nothing is lost"},
+         "characters after a short closing tag"},
+        {title, "<Title>Stakeout</>12345", {}, "after the part that is read last nothing is lost"},
         {"          <Field><VariableName>FILLER",
          "          ¦<Field></Field><Field><VariableName>FILLER",
          {{"error", "an empty <Field> ends its list: what follows in the list is not read"}},
@@ -127,11 +127,11 @@ TEST(TemplateCheck, RemarksOnTemplatesAndTheirNames)
              .replace(QStringLiteral("<Name>Points"), QStringLiteral("¦<Name>Points"))
              .replace(QStringLiteral("    <Options>"), QStringLiteral("    <Name>STAKEOUT</Name>\n    <Options>")),
          {{"error", "the template's own <Name> must come before <Tables>: this one was taken for it"}},
-         "the name stands after the tables"},
+         "the name comes after the tables"},
         {changedTemplate("<Name>STAKEOUT</Name>", "<Name>STAKEOUT</>")
              .replace(QStringLiteral("<Name>Points"), QStringLiteral("¦<Name>Points")),
          {{"error", "<Name> is inside another <Name>: the outer one ends at the first closing tag"}},
-         "a short closing tag where a full one of the name stands behind: the name runs on"},
+         "a short closing tag where a full one of the name follows: the name runs on"},
         {changedTemplate("<Separator>|</Separator>", "")
              .replace(QStringLiteral("<Options>"), QStringLiteral("¦<Options>")),
          {{"warning", "no <Separator>: the columns are separated by the character 0"}},

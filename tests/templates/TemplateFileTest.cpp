@@ -35,7 +35,7 @@ struct Row
 
 constexpr Row rows[] = {
     {""sv, u""sv, "an empty file"},
-    {"<Name>A</Name>\r\n"sv, u"<Name>A</Name>\r\n"sv, "plain ASCII, as it stands"},
+    {"<Name>A</Name>\r\n"sv, u"<Name>A</Name>\r\n"sv, "plain ASCII, as it is"},
     {"\xC3\xA9"sv, u"é"sv, "two bytes of UTF-8"},
     {"\xE7\x82\xB9"sv, u"点"sv, "three bytes of UTF-8"},
     {"\xF0\x9F\x98\x80"sv, u"\U0001F600"sv, "four bytes of UTF-8 are a surrogate pair"},
@@ -44,12 +44,12 @@ constexpr Row rows[] = {
     {"\xC3"sv, u"\u00C3"sv, "cut off in the middle of a character"},
     {"\xE7\x82"sv, u"\u00E7\u0082"sv, "cut off before the last byte of a character"},
     {"\xA9"sv, u"©"sv, "a second byte without a first"},
-    {"\xC0\x80"sv, u"\u00C0\u0080"sv, "a zero in two bytes is no valid UTF-8"},
+    {"\xC0\x80"sv, u"\u00C0\u0080"sv, "a zero in two bytes is not valid UTF-8"},
     {"\xE0\x80\xAF"sv, u"\u00E0\u0080\u00AF"sv, "more bytes than the character needs"},
-    {"\xED\xA0\x80"sv, u"\u00ED\u00A0\u0080"sv, "half of a surrogate pair is no character"},
+    {"\xED\xA0\x80"sv, u"\u00ED\u00A0\u0080"sv, "half of a surrogate pair is not a character"},
     {"\xF4\x90\x80\x80"sv, u"\u00F4\u0090\u0080\u0080"sv, "beyond the last code point"},
     {"\x80\x9F\xFF"sv, u"\u0080\u009F\u00FF"sv, "Latin-1 to its ends, nothing of another code page"},
-    {"\xEF\xBB\xBF<Name>\xC3\xA9"sv, u"<Name>é"sv, "a byte-order mark is no part of the text"},
+    {"\xEF\xBB\xBF<Name>\xC3\xA9"sv, u"<Name>é"sv, "a byte-order mark is not part of the text"},
     {"a\0b"sv, u"a"sv, "a zero byte ends the text of the only chunk"},
     {"\0ab"sv, u""sv, "a zero byte at the front"},
     {"ab\0"sv, u"ab"sv, "a zero byte at the end"},
@@ -113,7 +113,7 @@ TEST(TemplateFile, CharacterAcrossAChunkBoundaryStaysWhole)
         for (qsizetype before = chunk - bytes.size(); before <= chunk; ++before) {
             const QString expected = QString(before, u'x') + QString::fromUtf8(bytes) + QStringLiteral("yz");
             EXPECT_EQ(TemplateFile(QByteArray(before, 'x') + bytes + "yz").text(), expected)
-                << bytes.size() << " bytes behind " << before;
+                << bytes.size() << " bytes after " << before;
         }
     }
 }
@@ -144,7 +144,7 @@ TEST(TemplateFile, ScansWithoutTabsAndLineEnds)
         {"abc", u"abc", {0, 1, 2, 3}, "nothing to strip"},
         {"a\tb\nc\rd\r\ne", u"abcde", {0, 2, 4, 6, 9, 10}, "each of the three, anywhere"},
         {"\n\n\tab", u"ab", {3, 4, 5}, "at the front"},
-        {"ab\r\n\t", u"ab", {0, 1, 2}, "at the end: the end stands behind the last character"},
+        {"ab\r\n\t", u"ab", {0, 1, 2}, "at the end: the end is after the last character"},
         {"\t\r\n", u"", {0}, "nothing else in the file"},
         {" a  b ", u" a  b ", {0, 1, 2, 3, 4, 5, 6}, "blanks are kept"},
         {"a\v\f\x1F\xC2\xA0z", u"a\v\f\u001F\u00A0z", {0, 1, 2, 3, 4, 5, 6}, "other white space is kept"},
@@ -190,7 +190,7 @@ TEST(TemplateFile, ReadsAnEmptyFile)
     EXPECT_TRUE(read->scanText().isEmpty());
 }
 
-TEST(TemplateFile, CannotReadWhatIsNoFile)
+TEST(TemplateFile, CannotReadWhatIsNotAFile)
 {
     const QTemporaryDir folder;
     EXPECT_FALSE(TemplateFile::read(folder.filePath(QStringLiteral("missing.xml"))));

@@ -44,8 +44,8 @@ TEST(UXmlReportTable, BuildsTheHeading)
 {
     const Row rows[] = {
         {'|', field("A", "Point", "8"), QStringLiteral("Point   "),
-         "one column, filled to its width, no separator behind"},
-        {'|', field("A", "Point", "8", "RIGHT"), QStringLiteral("   Point"), "right: the blanks stand before"},
+         "one column, filled to its width, no separator after it"},
+        {'|', field("A", "Point", "8", "RIGHT"), QStringLiteral("   Point"), "right: the blanks come first"},
         {'|', field("A", "Point", "8", "CENTER"), QStringLiteral("Point   "), "centred: the heading is on the left"},
         {'|', field("A", "Point", "3"), QStringLiteral("Point"), "a label wider than its format is whole"},
         {'|', field("A", "", "3") + field("B", "", "2"), QStringLiteral("   |  "), "no labels"},
@@ -63,7 +63,7 @@ TEST(UXmlReportTable, BuildsTheHeading)
         {'|', field("Filler", "xy", "4") + field("A", "a", "1"), QStringLiteral("xy  a"),
          "a filler with a label, any case"},
         {'|', field("A", "a", "1") + field("SUFFIX_R", "", "") + field("B", "b", "1"), QStringLiteral("a|b"),
-         "a suffix joins the column behind it"},
+         "a suffix joins the column after it"},
         {'|', field("A", "a", "1") + field("suffix_+", "", "") + field("B", "b", "1"), QStringLiteral("a|b"),
          "the other suffix, any case"},
         {'|', field("A", "a", "1") + field("FILLER", "", ""), QStringLiteral("a|"), "a filler at the end"},

@@ -91,7 +91,7 @@ TEST(UXmlReportTplLists, SortIdentifiersHaveNoSign)
     EXPECT_EQ(ids, (std::vector<quint32>{4294967290U, 6U}));
 }
 
-TEST(UXmlReportTplLists, TextOutsideTheTemplatesIsPassedOver)
+TEST(UXmlReportTplLists, TextOutsideTheTemplatesIsSkipped)
 {
     const LoadedTemplate loaded("<?xml version=\"1.0\" encoding=\"UTF-8\"?>\r\n"
                                 "<!-- the office's templates & more > less -->\r\n"
@@ -110,7 +110,7 @@ TEST(UXmlReportTplLists, AnEmptyTemplateTableBlockOrDictionaryEndsItsList)
         templateOf({}) + "<ReportTemplate></ReportTemplate>" + named("ReportTemplate", "U");
     const LoadedTemplate templates(emptyTemplate);
     EXPECT_EQ(listed(&UXmlReportTpl::GetAllTPLsByName, templates.tpl), QStringLiteral("T"));
-    EXPECT_FALSE(LoadedTemplate(emptyTemplate, QStringLiteral("U")).loaded) << "it stands behind the empty one";
+    EXPECT_FALSE(LoadedTemplate(emptyTemplate, QStringLiteral("U")).loaded) << "it comes after the empty one";
 
     const LoadedTemplate loaded(templateOf(
         element("Tables", named("Table", "A") + "<Table></Table>" + named("Table", "B")) +

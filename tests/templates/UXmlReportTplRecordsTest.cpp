@@ -223,7 +223,7 @@ TEST(UXmlReportTplRecords, OfSeveralMatchesTheLastWins)
                     dictionary("d", {variable(9, "A", "AREA"), variable(10, "B", "Radius")}))));
     ASSERT_TRUE(loaded.loaded);
     EXPECT_EQ(shown(loaded.tpl.GetTable(QStringLiteral("X"))->Fields), "A:9:11 B:3:2")
-        << "of variables in one dictionary and of dictionaries of one name; one of unknown type is none";
+        << "of variables in one dictionary and of dictionaries of one name; one of unknown type is not found";
     qint32 id = -5;
     qint32 type = -6;
     EXPECT_TRUE(loaded.tpl.FindVariable(QStringLiteral("D"), QStringLiteral("a"), id, type));

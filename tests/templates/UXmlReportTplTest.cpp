@@ -130,7 +130,7 @@ TEST_F(UXmlReportTplTest, FailsAndHoldsNothingWithoutTheRequestedTemplate)
         {"", "STAKEOUT", "an empty file"},
         {"\r\n\t", "STAKEOUT", "nothing but line ends"},
         {"<Name>STAKEOUT</Name>", "STAKEOUT", "no template around the name"},
-        {"<ReportTemplate><Title>STAKEOUT</Title></ReportTemplate>", "STAKEOUT", "a title is no name"},
+        {"<ReportTemplate><Title>STAKEOUT</Title></ReportTemplate>", "STAKEOUT", "a title is not a name"},
         {"<ReportTemplate></ReportTemplate>" + stakeout, "STAKEOUT", "an empty template ends the list"},
         {"<ReportTemplate ><Name>STAKEOUT</Name></ReportTemplate>", "STAKEOUT", "a blank makes it no tag"},
     };
@@ -184,7 +184,7 @@ TEST_F(UXmlReportTplTest, NameClosedByTheShortFormDropsFourCharacters)
     EXPECT_EQ(torn.tpl.GetTemplateTitle(), QString()) << "the dropped characters begin the next tag";
 }
 
-TEST_F(UXmlReportTplTest, NameBehindTheTablesIsNotTheTemplates)
+TEST_F(UXmlReportTplTest, NameAfterTheTablesIsNotTheTemplates)
 {
     const LoadedTemplate loaded("<ReportTemplate><Tables><Table><Name>Points</Name></Table></Tables><Name>T</Name>"
                                 "</ReportTemplate>");
@@ -242,7 +242,7 @@ TEST_F(UXmlReportTplTest, ReadsTheOptions)
     }
 }
 
-TEST_F(UXmlReportTplTest, TakesATextAsItStandsForTheNameItHas)
+TEST_F(UXmlReportTplTest, TakesATextAsItIsForTheNameItHas)
 {
     UXmlReportTpl tpl;
     setName(tpl, QStringLiteral("T"));

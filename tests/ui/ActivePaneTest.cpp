@@ -211,7 +211,7 @@ TEST_F(ActivePane, AViewThatGoesWhenItIsNoLongerTheActiveOneIsNotPassedOn)
     EXPECT_EQ(wrongWithActive(*desk.frame), QString());
 }
 
-TEST_F(ActivePane, AViewThatNobodySeesLeavesTheKeyboardItsCommands)
+TEST_F(ActivePane, AViewThatIsHiddenLeavesTheKeyboardItsCommands)
 {
     UView *hidden = reports[0]->GetViews().front();
     pane(0).ShowPane(false);
@@ -226,7 +226,7 @@ TEST_F(ActivePane, AViewThatNobodySeesLeavesTheKeyboardItsCommands)
     EXPECT_TRUE(desk.frame->OnCommand(57637));
 }
 
-TEST_F(ActivePane, NoCommandReachesAViewThatNobodySees)
+TEST_F(ActivePane, NoCommandReachesAViewThatIsHidden)
 {
     QGuiApplication::clipboard()->setText(QStringLiteral("pasted"));
     reports[0]->SetData(QStringLiteral("kept"));

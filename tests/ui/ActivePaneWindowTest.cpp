@@ -198,7 +198,7 @@ TEST_F(ReportWindowInFront, UpdateTextSendsWhatTheReportHoldsNow)
         window.OnPrint();
         EXPECT_EQ(printing.prints, 1);
     }
-    ASSERT_EQ(report->GetViews().size(), 2U) << "printing has left a view of its own, which nobody sees";
+    ASSERT_EQ(report->GetViews().size(), 2U) << "printing has left a view of its own, which is not seen";
     report->UpdateReportInfo(QStringLiteral("Traverse"), false, false);
     report->Clear();
     report->WriteLine(QStringLiteral("third"), 0, 1, 0);

@@ -86,7 +86,7 @@ TEST(CReportToolBar, HasAButtonForEachCommandOfTheReportWindow)
     }
 }
 
-TEST(CReportToolBar, StandsWhereItIs)
+TEST(CReportToolBar, StaysWhereItIs)
 {
     Owner owner;
     const CReportToolBar bar(&owner);
@@ -111,7 +111,7 @@ TEST(CReportToolBar, ShowsTheNameOfAButtonWhenTheMouseRestsOnIt)
     QToolTip::hideText();
 }
 
-TEST(CReportToolBar, AnActionThatIsNoneOfItsCommandsHasNoName)
+TEST(CReportToolBar, AnActionThatIsNotOneOfItsCommandsHasNoName)
 {
     Owner owner;
     const CReportToolBar bar(&owner);
@@ -345,7 +345,7 @@ TEST(CReportToolBar, IsWorkedWithTheKeyboardAlone)
     window.owner.enabled = {false, true, false};
     window.bar->OnUpdateCmdUI(nullptr, true);
     window.before->setFocus();
-    EXPECT_EQ(window.press(Qt::Key_Tab), buttonOf(*window.bar, 1)) << "what is disabled is passed over";
+    EXPECT_EQ(window.press(Qt::Key_Tab), buttonOf(*window.bar, 1)) << "what is disabled is skipped";
     EXPECT_EQ(window.press(Qt::Key_Tab), window.after);
 }
 

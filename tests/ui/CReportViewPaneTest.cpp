@@ -105,7 +105,7 @@ TEST(CReportViewPane, RefusesToCloseWhileAnEditorHoldsTheReport)
         putCursor(view->GetEdit(), 5);
         report->EnableCloseOption(false);
         way.close(pane);
-        ASSERT_EQ(desk.messages.size(), 1U) << way.name << ": nobody asks whether to save";
+        ASSERT_EQ(desk.messages.size(), 1U) << way.name << ": nothing asks whether to save";
         const kareport::Message &message = desk.messages[0];
         EXPECT_EQ(message.text, QStringLiteral("The Report can only be closed when the associated editor is closed"))
             << way.name;
@@ -208,7 +208,7 @@ TEST(CReportViewPane, WithoutAViewOfAReportItAlwaysCloses)
     document->SetModifiedFlag();
     EXPECT_TRUE(text->CanClosePane());
     text->OnSysCommand(scClose, 0);
-    EXPECT_FALSE(CViewPane::IsOpen(text)) << "a document that is no report is not asked";
+    EXPECT_FALSE(CViewPane::IsOpen(text)) << "a document that is not a report is not asked";
     EXPECT_EQ(log.documents, 0);
 
     auto *other = new CReportViewPane;

@@ -33,7 +33,7 @@ TEST(LineWidth, ALineIsShownWithoutWhatCannotBeSeen)
         {u"a\tb", u"a       b", "a tab leads to the eighth column"},
         {u"1234567\tb", u"1234567 b", "at least one blank"},
         {u"12345678\tb", u"12345678        b", "from column 8 to column 16"},
-        {u"\t\tb", u"                b", "tab behind tab"},
+        {u"\t\tb", u"                b", "tab after tab"},
         {u"a\u0001b\u007Fc\u0085d\u2028e\u2029f", u"a b c d e f", "other control characters and separators"},
         {u"°\u00A0測量", u"°\u00A0測量", "no control characters"},
     };
@@ -78,7 +78,7 @@ TEST(LineWidth, IsTheWidthThatTheLineIsDrawnWith)
 
 TEST(LineWidth, AddsUpWithoutLosingFractions)
 {
-    // At this size the advance is no whole number of pixels: a rounded one would be wrong by the width of the last words.
+    // At this size the advance is not a whole number of pixels: a rounded one would be wrong by the width of the last words.
     QWidget device;
     QFont font = kareport::reportFont(QStringLiteral("DejaVu Sans Mono"), 0);
     font.setPixelSize(11);

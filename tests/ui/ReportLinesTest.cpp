@@ -21,8 +21,8 @@ TEST(ReportLines, KeepsEveryLineExactlyAsItWasAdded)
     const Row rows[] = {
         {QString(), "nothing"},
         {QStringLiteral("x"), "an odd number of bytes, before characters of two"},
-        {QStringLiteral("測量"), "wide characters at once behind"},
-        {QStringLiteral("  two blanks before and behind  "), "blanks are text"},
+        {QStringLiteral("測量"), "wide characters right after"},
+        {QStringLiteral("  two blanks before and after  "), "blanks are text"},
         {QString(QChar(0)) + u'a' + QChar(0), "the character 0"},
         {QStringLiteral("N 45°12'30\" E \u00FF"), "the last character of one byte"},
         {QStringLiteral("\u0100"), "the first of two"},

@@ -50,7 +50,7 @@ TEST(ReportWindowEntry, TheListReceivesEachPieceAsItIsWritten)
         WindowDesk::rowsOf(WindowDesk::windowOf(report)),
         (QStringList{headerOf(QStringLiteral("Traverse"), 1), QStringLiteral("Heading"), QStringLiteral("  indented"),
                      QStringLiteral("open "), QStringLiteral("line\r\n"), QStringLiteral("last")}))
-        << "the page's header too; line ends and empty pieces are no rows";
+        << "the page's header too; line ends and empty pieces are not rows";
 }
 
 TEST(ReportWindowEntry, TheWorkingViewKeepsTheKeyboard)

@@ -213,7 +213,7 @@ TEST_F(ReportListTest, TheKeyboardMovesTheCurrentLine)
         {Qt::Key_Down, 1, "the next"},        {Qt::Key_PageDown, 1 + page, "a page, with one line of the one before"},
         {Qt::Key_Down, 2 + page, "the next"}, {Qt::Key_Up, 1 + page, "the one before"},
         {Qt::Key_PageUp, 1, "back"},          {Qt::Key_PageUp, 0, "not before the first"},
-        {Qt::Key_End, 99, "the last"},        {Qt::Key_Down, 99, "there is none behind"},
+        {Qt::Key_End, 99, "the last"},        {Qt::Key_Down, 99, "there is none after it"},
         {Qt::Key_PageDown, 99, "nor a page"},
     };
     for (const Row &row : rows) {
@@ -264,7 +264,7 @@ TEST_F(ReportListTest, AClickMakesALineTheCurrentOne)
     EXPECT_FALSE(list.indexAt(QPoint(5, -1)).isValid());
     list.resize(300, 5000);
     settle();
-    EXPECT_FALSE(list.indexAt(QPoint(5, 4000)).isValid()) << "behind the last";
+    EXPECT_FALSE(list.indexAt(QPoint(5, 4000)).isValid()) << "after the last";
 }
 
 TEST_F(ReportListTest, CopiesTheCurrentLineThoughAMenuHasTheKey)
@@ -352,7 +352,7 @@ TEST_F(ReportListTest, PlacesOfLinesAreScrolledTo)
         {500, QAbstractItemView::PositionAtBottom, 501 * height - page, "at the bottom"},
         {500, QAbstractItemView::PositionAtCenter, (1001 * height - page) / 2, "in the middle"},
         {0, QAbstractItemView::PositionAtBottom, 0, "not before the beginning"},
-        {999, QAbstractItemView::PositionAtTop, 1000 * height - page, "not behind the end"},
+        {999, QAbstractItemView::PositionAtTop, 1000 * height - page, "not past the end"},
     };
     for (const Row &row : rows) {
         list.scrollTo(list.model()->index(row.row, 0), row.hint);

@@ -49,7 +49,7 @@ TEST_F(ReportWindowCommands, ButtonsFollowByThemselves)
     ASSERT_TRUE(save->isEnabled());
     report->SetModifiedFlag(false);
     EXPECT_TRUE(QTest::qWaitFor([save] { return !save->isEnabled(); }, 5000))
-        << "a report tells nobody that it is saved";
+        << "a report does not tell that it is saved";
     report->SetModifiedFlag(true);
     EXPECT_TRUE(QTest::qWaitFor([save] { return save->isEnabled(); }, 5000));
 }

@@ -27,7 +27,7 @@ TEST_F(ReportWindowDock, TheActiveMarkShowsOnTheCaption)
     EXPECT_EQ(caption(), plain);
 }
 
-TEST_F(ReportWindowDock, NeverStandsAmongTheDocumentsAsATab)
+TEST_F(ReportWindowDock, IsNeverATabAmongTheDocuments)
 {
     UReportDoc *report = desk.openReport(QStringLiteral("Survey"));
     QDockWidget *document = dynamic_cast<COneViewPane *>(report->GetFrameWindow())->GetDock();
@@ -79,7 +79,7 @@ TEST_F(ReportWindowDock, AFrameThatMakesTabsOfEverythingIsObeyed)
     EXPECT_TRUE(window.IsVisible());
 }
 
-TEST_F(ReportWindowDock, ADocumentThatFloatsIsNoTab)
+TEST_F(ReportWindowDock, ADocumentThatFloatsIsNotATab)
 {
     UReportDoc *report = desk.openReport(QStringLiteral("Survey"));
     QDockWidget *document = dynamic_cast<COneViewPane *>(report->GetFrameWindow())->GetDock();
@@ -94,7 +94,7 @@ TEST_F(ReportWindowDock, ADocumentThatFloatsIsNoTab)
     EXPECT_EQ(desk.frame->dockWidgetArea(window.GetDock()), Qt::RightDockWidgetArea);
 }
 
-TEST_F(ReportWindowDock, ItsCaptionIsNoDocumentsTitle)
+TEST_F(ReportWindowDock, ItsCaptionIsNotADocumentsTitle)
 {
     ASSERT_TRUE(create());
     EXPECT_FALSE(paneCaptions().contains(QStringLiteral("Traverse")));

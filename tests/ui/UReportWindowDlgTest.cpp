@@ -94,7 +94,7 @@ TEST_F(ReportWindow, IsCreatedOnce)
     EXPECT_EQ(window.GetWindowTextW(), QStringLiteral("Traverse"));
 }
 
-TEST_F(ReportWindow, StandsAtTheLeftUnlessItIsDocked)
+TEST_F(ReportWindow, IsAtTheLeftUnlessItIsDocked)
 {
     EXPECT_TRUE(window.Create(QString(), nullptr));
     WindowDesk::settle();
@@ -112,7 +112,7 @@ TEST_F(ReportWindow, ThereIsNoneWithoutAFrame)
     EXPECT_EQ(window.GetList(), nullptr);
 }
 
-TEST_F(ReportWindow, TheBarStandsAboveTheList)
+TEST_F(ReportWindow, TheBarIsAboveTheList)
 {
     ASSERT_TRUE(create());
     const int bar = window.GetToolBar()->sizeHint().height();
@@ -229,7 +229,7 @@ TEST_F(ReportWindow, IsRefilledFromTheReportsText)
         {QStringLiteral("A\r\n  B\r\n\r\nC\r\n"), {a, b, c}, "the last line ended"},
         {QStringLiteral("\r\n\r\n"), {}, "only empty lines"},
         {QStringLiteral("   \r\n \t \r\n  "), {}, "only blank ones"},
-        {QStringLiteral("A \r\nB\t\r\n"), {QStringLiteral("A "), QStringLiteral("B\t")}, "blanks behind stay"},
+        {QStringLiteral("A \r\nB\t\r\n"), {QStringLiteral("A "), QStringLiteral("B\t")}, "blanks at the end stay"},
         {QStringLiteral("A\rB\r\rC"), {a, b, c}, "a carriage return ends a line"},
         {QStringLiteral("A\nB\r\nC"), {QStringLiteral("A\nB"), c}, "a line feed alone does not"},
         {QStringLiteral("\n\n A"), {a}, "line feeds before a line go with its blanks"},
@@ -318,7 +318,7 @@ TEST_F(ReportWindow, EscapeEndsWhatThePreviousViewIsInTheMiddleOf)
     QKeyEvent question(QEvent::ShortcutOverride, Qt::Key_Escape, Qt::NoModifier);
     question.ignore();
     EXPECT_TRUE(window.PreTranslateMessage(&question));
-    EXPECT_TRUE(question.isAccepted()) << "it is to come as a key, not as somebody's shortcut";
+    EXPECT_TRUE(question.isAccepted()) << "it is to come as a key, not as a shortcut";
     EXPECT_TRUE(input.reasons.empty()) << "nothing ends before it does";
 
     QKeyEvent escape(QEvent::KeyPress, Qt::Key_Escape, Qt::NoModifier);

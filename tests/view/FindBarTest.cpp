@@ -181,7 +181,7 @@ TEST(FindBar, ATextThatIsReplacedWhileItIsCountedIsCountedAnew)
     EXPECT_FALSE(f.bar().isCounting()) << "what it was counting is gone";
     f.settle();
     EXPECT_TRUE(f.bar().findNext());
-    EXPECT_EQ(f.count(), QStringLiteral("1 of 2")) << "the cursor stood behind the end of the new text";
+    EXPECT_EQ(f.count(), QStringLiteral("1 of 2")) << "the cursor was past the end of the new text";
 }
 
 TEST(FindBar, ClosingStopsTheCount)

@@ -61,7 +61,7 @@ TEST(ReportEdit, TellsOfAnEditWhatItIs)
     // The text is "ab\ncd\n", in the document "ab\r\ncd\r\n".
     constexpr Row rows[] = {
         {0, 0, u"x", 0, 0, u"x", "before everything"},
-        {6, 0, u"x", 8, 0, u"x", "behind everything: two line ends before it"},
+        {6, 0, u"x", 8, 0, u"x", "after everything: two line ends before it"},
         {2, 1, u"", 2, 2, u"", "a line end is two characters"},
         {3, 0, u"x", 4, 0, u"x", "in the second line"},
         {1, 3, u"\n", 1, 4, u"\r\n", "across a line end, by a line end"},
@@ -102,13 +102,13 @@ TEST(ReportEdit, AFormatOfTheLastParagraphReachesNoFurtherThanTheText)
     indented.setIndent(1);
     QTextCursor(t.edit.document()->lastBlock()).setBlockFormat(indented);
     for (const ReportChange &change : t.changes) {
-        EXPECT_LE(change.position + change.removed, 5) << "the end of the last paragraph is no character";
+        EXPECT_LE(change.position + change.removed, 5) << "the end of the last paragraph is not a character";
         EXPECT_EQ(change.documentInserted().size(), change.documentRemoved());
     }
     EXPECT_EQ(t.edit.windowText(), QStringLiteral("ab\r\ncd"));
 }
 
-TEST(ReportEdit, LoadingAndFollowingAreNoEditsAndCannotBeUndone)
+TEST(ReportEdit, LoadingAndFollowingAreNotEditsAndCannotBeUndone)
 {
     Edited t(QStringLiteral("one"));
     Edited source(QStringLiteral("one"));
@@ -414,7 +414,7 @@ TEST(ReportEdit, ACopyWithoutMemoryIsSaidAndLeavesClipboardAndText)
                   QStringList{QStringLiteral("There is not enough memory to copy this. The clipboard is as it was.")});
         said.clear();
         const std::unique_ptr<QMimeData> dragged(edit.createMimeDataFromSelection());
-        EXPECT_FALSE(dragged->hasText()) << "nobody takes what is dragged then";
+        EXPECT_FALSE(dragged->hasText()) << "what is dragged then is not taken";
     });
     kareport::setMessageHandler({});
 }

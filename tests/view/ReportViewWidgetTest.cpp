@@ -31,7 +31,7 @@ TEST(ReportViewWidget, SaysWhereTheCursorIs)
     };
     constexpr Row rows[] = {
         {u"", 3, 0, "Page 1 of 1, Line 1, Column 1", "nothing"},
-        {u"ab", 3, 2, "Page 1 of 1, Line 1, Column 3", "behind the last character"},
+        {u"ab", 3, 2, "Page 1 of 1, Line 1, Column 3", "after the last character"},
         {u"1\n2\n3\n", 3, 4, "Page 1 of 1, Line 3, Column 1", "a full page"},
         {u"1\n2\n3\n", 3, 6, "Page 1 of 1, Line 4, Column 1", "what the last line end opens begins no page"},
         {u"1\n2\n3\n4", 3, 6, "Page 2 of 2, Line 4, Column 1", "a character more does"},
@@ -89,9 +89,9 @@ TEST(ReportViewWidget, GoesToAPageWhoseFirstLineIsThenAtTheTop)
         {3, 40, "one in the middle"},
         {50, 980, "the last"},
         {0, 0, "below the first"},
-        {51, 980, "behind the last"},
+        {51, 980, "after the last"},
         {-2147483647, 0, "far below"},
-        {2147483647, 980, "far behind"},
+        {2147483647, 980, "far past it"},
     };
     ReportViewWidget widget;
     widget.setLinesPerPage([] { return 20; });
@@ -203,7 +203,7 @@ TEST(ReportViewWidget, TellsOfAPressOfTheMouse)
     ReportViewWidget widget;
     widget.resize(400, 300);
     widget.show();
-    QTest::mouseClick(widget.edit().viewport(), Qt::LeftButton); // nobody listens
+    QTest::mouseClick(widget.edit().viewport(), Qt::LeftButton); // nothing is connected
     int presses = 0;
     widget.setPressHandler([&presses] { ++presses; });
     QTest::mouseClick(widget.edit().viewport(), Qt::LeftButton);

@@ -34,9 +34,9 @@ TEST(TextSearch, FindsByCaseAndWholeWord)
         {u"point_1 point-1", u"point", false, true, 8, 1, "an underscore belongs to a word, a hyphen does not"},
         {u"\u6E2Cpoint point\u6E2C", u"point", false, true, -1, 0, "CJK characters are letters"},
         {u"\U00020000point", u"point", false, true, -1, 0, "a letter of two units before it"},
-        {u"point\U00020000", u"point", false, true, -1, 0, "and behind it"},
-        {u"\U0001F600point\U0001F600", u"point", false, true, 2, 1, "a picture is no letter"},
-        {u"\xDC00point", u"point", false, true, 1, 1, "half of a pair is no letter"},
+        {u"point\U00020000", u"point", false, true, -1, 0, "and after it"},
+        {u"\U0001F600point\U0001F600", u"point", false, true, 2, 1, "a picture is not a letter"},
+        {u"\xDC00point", u"point", false, true, 1, 1, "half of a pair is not a letter"},
         {u"a.b axb", u"a.b", false, false, 0, 1, "a dot stands for itself"},
         {u"point point", u"point", false, true, 0, 2, "the first and the last word of a line"},
     };
@@ -58,8 +58,8 @@ TEST(TextSearch, TheLastMatchBeforeAPlaceIsOneThatIsCounted)
         const char *reason;
     };
     constexpr Row rows[] = {
-        {0, -1, "nothing before the line"}, {1, 0, "the first"},        {2, 0, "it begins before the place"},
-        {3, 2, "not the one at 1"},         {100, 2, "behind the end"},
+        {0, -1, "nothing before the line"}, {1, 0, "the first"},       {2, 0, "it begins before the place"},
+        {3, 2, "not the one at 1"},         {100, 2, "after the end"},
     };
     for (const Row &row : rows) {
         EXPECT_EQ(search.findLast(u"aaaa", row.before), row.expected) << row.reason;

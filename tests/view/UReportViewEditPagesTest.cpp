@@ -67,76 +67,78 @@ void joinWithLineBefore(ReportEdit &edit)
     QTest::keyClick(&edit, Qt::Key_Delete);
 }
 
+/// An edit of three pages, and what the pages begin with after it.
+struct FirstEdit
+{
+    const char *at; ///< the cursor is before it
+    int length;     ///< of what is selected
+    void (*act)(ReportEdit &edit);
+    QStringList expected;
+    const char *reason;
+};
+const QStringList three = {QStringLiteral("page 1"), QStringLiteral("page 2"), QStringLiteral("page 3")};
+const FirstEdit firstEdits[] = {
+    {"last of 1", 0, [](ReportEdit &e) { QTest::keyClick(&e, Qt::Key_X); }, three, "a letter"},
+    {"last of 1", 0, [](ReportEdit &e) { QTest::keyClick(&e, Qt::Key_Return); }, three, "a line end"},
+    {"last of 2", 5,
+     [](ReportEdit &e) {
+         QApplication::clipboard()->setText(QStringLiteral("1\n2\n3\n"));
+         e.paste();
+     },
+     three, "lines over a selection"},
+    {"page 2", 0, [](ReportEdit &e) { QTest::keyClick(&e, Qt::Key_Return); }, three,
+     "a line end at a page's start is the page's before"},
+    {"page 2",
+     0,
+     [](ReportEdit &e) { QTest::keyClick(&e, Qt::Key_X); },
+     {QStringLiteral("page 1"), QStringLiteral("xpage 2"), QStringLiteral("page 3")},
+     "a letter there is the page's"},
+    {"page 2",
+     6,
+     [](ReportEdit &e) { QTest::keyClick(&e, Qt::Key_Delete); },
+     {QStringLiteral("page 1"), QString(), QStringLiteral("page 3")},
+     "the first line of a page goes, not the page"},
+    {"page 1",
+     0,
+     [](ReportEdit &e) { QTest::keyClick(&e, Qt::Key_Return); },
+     {QString(), QStringLiteral("page 2"), QStringLiteral("page 3")},
+     "before the first page there is none"},
+    {"page 2", 0, [](ReportEdit &e) { QTest::keyClick(&e, Qt::Key_Backspace); }, three,
+     "a blank line before a page goes"},
+    {"page 2",
+     0,
+     [](ReportEdit &e) { joinWithLineBefore(e); },
+     {QStringLiteral("page 1"), QStringLiteral("page 3")},
+     "a start that begins no line does not count"},
+    {"page 2", 0,
+     [](ReportEdit &e) {
+         joinWithLineBefore(e);
+         e.undo();
+     },
+     three, "and counts again"},
+    {"page 3",
+     0,
+     [](ReportEdit &e) {
+         e.moveCursor(QTextCursor::Start, QTextCursor::KeepAnchor);
+         QTest::keyClick(&e, Qt::Key_Delete);
+     },
+     {QStringLiteral("page 3")},
+     "all before a page"},
+};
+
 TEST(UReportViewEditPages, TheFirstEditCarriesTheRecordAlong)
 {
-    struct Row
-    {
-        const char *at; ///< the cursor is before it
-        int length;     ///< of what is selected
-        void (*act)(ReportEdit &edit);
-        QStringList expected;
-        const char *reason;
-    };
-    const QStringList three = {QStringLiteral("page 1"), QStringLiteral("page 2"), QStringLiteral("page 3")};
-    const Row rows[] = {
-        {"last of 1", 0, [](ReportEdit &e) { QTest::keyClick(&e, Qt::Key_X); }, three, "a letter"},
-        {"last of 1", 0, [](ReportEdit &e) { QTest::keyClick(&e, Qt::Key_Return); }, three, "a line end"},
-        {"last of 2", 5,
-         [](ReportEdit &e) {
-             QApplication::clipboard()->setText(QStringLiteral("1\n2\n3\n"));
-             e.paste();
-         },
-         three, "lines over a selection"},
-        {"page 2", 0, [](ReportEdit &e) { QTest::keyClick(&e, Qt::Key_Return); }, three,
-         "a line end at a page's start is the page's before"},
-        {"page 2",
-         0,
-         [](ReportEdit &e) { QTest::keyClick(&e, Qt::Key_X); },
-         {QStringLiteral("page 1"), QStringLiteral("xpage 2"), QStringLiteral("page 3")},
-         "a letter there is the page's"},
-        {"page 2",
-         6,
-         [](ReportEdit &e) { QTest::keyClick(&e, Qt::Key_Delete); },
-         {QStringLiteral("page 1"), QString(), QStringLiteral("page 3")},
-         "the first line of a page goes, not the page"},
-        {"page 1",
-         0,
-         [](ReportEdit &e) { QTest::keyClick(&e, Qt::Key_Return); },
-         {QString(), QStringLiteral("page 2"), QStringLiteral("page 3")},
-         "before the first page there is none"},
-        {"page 2", 0, [](ReportEdit &e) { QTest::keyClick(&e, Qt::Key_Backspace); }, three,
-         "a blank line before a page goes"},
-        {"page 2",
-         0,
-         [](ReportEdit &e) { joinWithLineBefore(e); },
-         {QStringLiteral("page 1"), QStringLiteral("page 3")},
-         "a start that begins no line does not count"},
-        {"page 2", 0,
-         [](ReportEdit &e) {
-             joinWithLineBefore(e);
-             e.undo();
-         },
-         three, "and counts again"},
-        {"page 3",
-         0,
-         [](ReportEdit &e) {
-             e.moveCursor(QTextCursor::Start, QTextCursor::KeepAnchor);
-             QTest::keyClick(&e, Qt::Key_Delete);
-         },
-         {QStringLiteral("page 3")},
-         "all before a page"},
-    };
     for (const Kind &kind : kinds()) {
-        for (const Row &row : rows) {
+        for (const FirstEdit &edit : firstEdits) {
             ShownReport t;
             t.report.SetRTFDataFlag(kind.isImage);
             writePages(t.report, kind.secondLine);
             UReportView &view = t.open();
             ASSERT_EQ(firstLines(view, t.report), three) << kind.name;
-            const int at = static_cast<int>(view.GetEdit().toPlainText().indexOf(QString::fromUtf8(row.at)));
-            putCursor(view.GetEdit(), at + row.length, at);
-            row.act(view.GetEdit());
-            EXPECT_EQ(firstLines(view, t.report), row.expected) << kind.name << ": " << row.reason;
+            const int at = static_cast<int>(view.GetEdit().toPlainText().indexOf(QString::fromUtf8(edit.at)));
+            putCursor(view.GetEdit(), at + edit.length, at);
+            edit.act(view.GetEdit());
+            EXPECT_EQ(firstLines(view, t.report), edit.expected) << kind.name << ": " << edit.reason;
         }
     }
 }

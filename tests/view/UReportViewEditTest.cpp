@@ -30,80 +30,81 @@ void paste(ReportEdit &edit, const QString &text)
     edit.paste();
 }
 
+constexpr Row edits[] = {
+    {u"|", [](ReportEdit &e) { key(e, Qt::Key_A); }, u"a", "into an empty report"},
+    {u"|", [](ReportEdit &e) { key(e, Qt::Key_Return); }, u"\n", "a line end into an empty report"},
+    {u"|", [](ReportEdit &e) { key(e, Qt::Key_Backspace); }, u"", "nothing to delete"},
+    {u"|ab\ncd", [](ReportEdit &e) { key(e, Qt::Key_X); }, u"xab\ncd", "before the first character"},
+    {u"ab\ncd|", [](ReportEdit &e) { key(e, Qt::Key_X); }, u"ab\ncdx", "after the last character"},
+    {u"ab\n|", [](ReportEdit &e) { key(e, Qt::Key_X); }, u"ab\nx", "after the last line end"},
+    {u"a|b\ncd", [](ReportEdit &e) { key(e, Qt::Key_Return); }, u"a\nb\ncd", "a line is cut in two"},
+    {u"a|b\ncd", [](ReportEdit &e) { key(e, Qt::Key_Return, Qt::ShiftModifier); }, u"a\nb\ncd",
+     "there are no breaks within a line"},
+    {u"a|b\ncd", [](ReportEdit &e) { key(e, Qt::Key_Tab); }, u"a\tb\ncd", "a tab is a character"},
+    {u"ab|\ncd", [](ReportEdit &e) { key(e, Qt::Key_X); }, u"abx\ncd", "before a line end"},
+    {u"ab\n|cd", [](ReportEdit &e) { key(e, Qt::Key_X); }, u"ab\nxcd", "after a line end"},
+    {u"ab|\ncd", [](ReportEdit &e) { key(e, Qt::Key_Delete); }, u"abcd", "the line end after the cursor"},
+    {u"ab\n|cd", [](ReportEdit &e) { key(e, Qt::Key_Backspace); }, u"abcd", "the line end before the cursor"},
+    {u"ab\n\n|\ncd", [](ReportEdit &e) { key(e, Qt::Key_Backspace); }, u"ab\n\ncd", "one of three line ends"},
+    {u"|ab\ncd", [](ReportEdit &e) { key(e, Qt::Key_Delete); }, u"b\ncd", "the first character"},
+    {u"ab\ncd|", [](ReportEdit &e) { key(e, Qt::Key_Backspace); }, u"ab\nc", "the last character"},
+    {u"ab\ncd|", [](ReportEdit &e) { key(e, Qt::Key_Delete); }, u"ab\ncd", "nothing after the last"},
+    {u"ab\n|", [](ReportEdit &e) { key(e, Qt::Key_Backspace); }, u"ab", "the last line end"},
+    {u"|\nab", [](ReportEdit &e) { key(e, Qt::Key_Delete); }, u"ab", "the first line end"},
+    {u"a|b\nc|d", [](ReportEdit &e) { key(e, Qt::Key_X); }, u"axd", "a selection across a line end"},
+    {u"|ab\ncd|", [](ReportEdit &e) { key(e, Qt::Key_X); }, u"x", "everything"},
+    {u"|ab\ncd|", [](ReportEdit &e) { key(e, Qt::Key_Delete); }, u"", "everything goes"},
+    {u"|ab\ncd\n|", [](ReportEdit &e) { e.cut(); }, u"", "everything is cut, with the last line end"},
+    {u"a\U0001F600|b", [](ReportEdit &e) { key(e, Qt::Key_Backspace); }, u"ab", "both halves of a pair"},
+    {u"a|\U0001F600b", [](ReportEdit &e) { key(e, Qt::Key_Delete); }, u"ab", "both halves, forwards"},
+    {u"a\U0001F600|b", [](ReportEdit &e) { key(e, Qt::Key_X); }, u"a\U0001F600xb", "after a pair"},
+    {u"a|b", [](ReportEdit &e) { paste(e, pair + QStringLiteral("\u6E2C")); }, u"a\U0001F600\u6E2Cb", "pasted"},
+    {u"a|b", [](ReportEdit &e) { paste(e, QStringLiteral("1\r\n2\r3\n4")); }, u"a1\n2\n3\n4b",
+     "line ends of all kinds are pasted as line ends"},
+    {u"a|b", [](ReportEdit &e) { paste(e, QStringLiteral("1\u20282\u20293")); }, u"a1\n2\n3b",
+     "separators of lines and paragraphs"},
+    {u"|a\nb|", [](ReportEdit &e) { paste(e, QStringLiteral("x\n")); }, u"x\n", "over everything"},
+    {u"a|b", [](ReportEdit &e) { paste(e, QStringLiteral("\u00A0")); }, u"a\u00A0b", "a no-break space stays one"},
+    {u"a|b",
+     [](ReportEdit &e) {
+         key(e, Qt::Key_X);
+         e.undo();
+     },
+     u"ab", "undone"},
+    {u"a|b",
+     [](ReportEdit &e) {
+         key(e, Qt::Key_X);
+         e.undo();
+         e.redo();
+     },
+     u"axb", "done again"},
+    {u"|a\nb|",
+     [](ReportEdit &e) {
+         e.cut();
+         e.undo();
+     },
+     u"a\nb", "everything comes back"},
+    {u"a|\nb",
+     [](ReportEdit &e) {
+         key(e, Qt::Key_Delete);
+         e.undo();
+     },
+     u"a\nb", "a line end comes back"},
+    {u"a|b",
+     [](ReportEdit &e) {
+         key(e, Qt::Key_Return);
+         key(e, Qt::Key_Return);
+         e.undo();
+         e.undo();
+     },
+     u"ab", "line ends go again"},
+    {u"ab cd|", [](ReportEdit &e) { key(e, Qt::Key_Backspace, Qt::ControlModifier); }, u"ab ", "a word"},
+    {u"|ab", [](ReportEdit &e) { e.undo(); }, u"ab", "loading is nothing that can be undone"},
+};
+
 TEST(UReportViewEdit, EveryEditIsInTheDocumentAtOnce)
 {
-    constexpr Row rows[] = {
-        {u"|", [](ReportEdit &e) { key(e, Qt::Key_A); }, u"a", "into an empty report"},
-        {u"|", [](ReportEdit &e) { key(e, Qt::Key_Return); }, u"\n", "a line end into an empty report"},
-        {u"|", [](ReportEdit &e) { key(e, Qt::Key_Backspace); }, u"", "nothing to delete"},
-        {u"|ab\ncd", [](ReportEdit &e) { key(e, Qt::Key_X); }, u"xab\ncd", "before the first character"},
-        {u"ab\ncd|", [](ReportEdit &e) { key(e, Qt::Key_X); }, u"ab\ncdx", "behind the last character"},
-        {u"ab\n|", [](ReportEdit &e) { key(e, Qt::Key_X); }, u"ab\nx", "behind the last line end"},
-        {u"a|b\ncd", [](ReportEdit &e) { key(e, Qt::Key_Return); }, u"a\nb\ncd", "a line is cut in two"},
-        {u"a|b\ncd", [](ReportEdit &e) { key(e, Qt::Key_Return, Qt::ShiftModifier); }, u"a\nb\ncd",
-         "there are no breaks within a line"},
-        {u"a|b\ncd", [](ReportEdit &e) { key(e, Qt::Key_Tab); }, u"a\tb\ncd", "a tab is a character"},
-        {u"ab|\ncd", [](ReportEdit &e) { key(e, Qt::Key_X); }, u"abx\ncd", "before a line end"},
-        {u"ab\n|cd", [](ReportEdit &e) { key(e, Qt::Key_X); }, u"ab\nxcd", "behind a line end"},
-        {u"ab|\ncd", [](ReportEdit &e) { key(e, Qt::Key_Delete); }, u"abcd", "the line end behind the cursor"},
-        {u"ab\n|cd", [](ReportEdit &e) { key(e, Qt::Key_Backspace); }, u"abcd", "the line end before the cursor"},
-        {u"ab\n\n|\ncd", [](ReportEdit &e) { key(e, Qt::Key_Backspace); }, u"ab\n\ncd", "one of three line ends"},
-        {u"|ab\ncd", [](ReportEdit &e) { key(e, Qt::Key_Delete); }, u"b\ncd", "the first character"},
-        {u"ab\ncd|", [](ReportEdit &e) { key(e, Qt::Key_Backspace); }, u"ab\nc", "the last character"},
-        {u"ab\ncd|", [](ReportEdit &e) { key(e, Qt::Key_Delete); }, u"ab\ncd", "nothing behind the last"},
-        {u"ab\n|", [](ReportEdit &e) { key(e, Qt::Key_Backspace); }, u"ab", "the last line end"},
-        {u"|\nab", [](ReportEdit &e) { key(e, Qt::Key_Delete); }, u"ab", "the first line end"},
-        {u"a|b\nc|d", [](ReportEdit &e) { key(e, Qt::Key_X); }, u"axd", "a selection across a line end"},
-        {u"|ab\ncd|", [](ReportEdit &e) { key(e, Qt::Key_X); }, u"x", "everything"},
-        {u"|ab\ncd|", [](ReportEdit &e) { key(e, Qt::Key_Delete); }, u"", "everything goes"},
-        {u"|ab\ncd\n|", [](ReportEdit &e) { e.cut(); }, u"", "everything is cut, with the last line end"},
-        {u"a\U0001F600|b", [](ReportEdit &e) { key(e, Qt::Key_Backspace); }, u"ab", "both halves of a pair"},
-        {u"a|\U0001F600b", [](ReportEdit &e) { key(e, Qt::Key_Delete); }, u"ab", "both halves, forwards"},
-        {u"a\U0001F600|b", [](ReportEdit &e) { key(e, Qt::Key_X); }, u"a\U0001F600xb", "behind a pair"},
-        {u"a|b", [](ReportEdit &e) { paste(e, pair + QStringLiteral("\u6E2C")); }, u"a\U0001F600\u6E2Cb", "pasted"},
-        {u"a|b", [](ReportEdit &e) { paste(e, QStringLiteral("1\r\n2\r3\n4")); }, u"a1\n2\n3\n4b",
-         "line ends of all kinds are pasted as line ends"},
-        {u"a|b", [](ReportEdit &e) { paste(e, QStringLiteral("1\u20282\u20293")); }, u"a1\n2\n3b",
-         "separators of lines and paragraphs"},
-        {u"|a\nb|", [](ReportEdit &e) { paste(e, QStringLiteral("x\n")); }, u"x\n", "over everything"},
-        {u"a|b", [](ReportEdit &e) { paste(e, QStringLiteral("\u00A0")); }, u"a\u00A0b", "a no-break space stays one"},
-        {u"a|b",
-         [](ReportEdit &e) {
-             key(e, Qt::Key_X);
-             e.undo();
-         },
-         u"ab", "undone"},
-        {u"a|b",
-         [](ReportEdit &e) {
-             key(e, Qt::Key_X);
-             e.undo();
-             e.redo();
-         },
-         u"axb", "done again"},
-        {u"|a\nb|",
-         [](ReportEdit &e) {
-             e.cut();
-             e.undo();
-         },
-         u"a\nb", "everything comes back"},
-        {u"a|\nb",
-         [](ReportEdit &e) {
-             key(e, Qt::Key_Delete);
-             e.undo();
-         },
-         u"a\nb", "a line end comes back"},
-        {u"a|b",
-         [](ReportEdit &e) {
-             key(e, Qt::Key_Return);
-             key(e, Qt::Key_Return);
-             e.undo();
-             e.undo();
-         },
-         u"ab", "line ends go again"},
-        {u"ab cd|", [](ReportEdit &e) { key(e, Qt::Key_Backspace, Qt::ControlModifier); }, u"ab ", "a word"},
-        {u"|ab", [](ReportEdit &e) { e.undo(); }, u"ab", "loading is nothing that can be undone"},
-    };
-    for (const Row &row : rows) {
+    for (const Row &row : edits) {
         const QStringList parts = QString::fromUtf16(row.before).split(u'|');
         ShownReport t(reportLines(parts.join(QString())));
         UReportView &view = t.open();
@@ -163,7 +164,7 @@ TEST(UReportViewEdit, OtherLineEndsBecomeCrLfWithTheFirstEdit)
     }
 }
 
-TEST(UReportViewEdit, WhatTheControlShowsWinsOverATextThatWasChangedBehindIt)
+TEST(UReportViewEdit, WhatTheControlShowsWinsOverATextThatWasChangedWithoutIt)
 {
     ShownReport t(QStringLiteral("ab\r\n"));
     UReportView &view = t.open();
@@ -362,7 +363,7 @@ TEST(UReportViewEdit, AViewOfTheImageStaysAViewOfTheImage)
     EXPECT_TRUE(late.GetEdit().toPlainText().startsWith(QStringLiteral("line"))) << "nor does a view of it";
 }
 
-TEST(UReportViewEdit, ATextOfTheSameLengthThatWasSetBehindTheViewIsNotTheOneThatIsShown)
+TEST(UReportViewEdit, ATextOfTheSameLengthThatWasSetWithoutTheViewIsNotTheOneThatIsShown)
 {
     ShownReport t(QStringLiteral("abcd"));
     UReportView &view = t.open();

@@ -66,7 +66,7 @@ TEST(UReportViewFocus, TheKeyboardMakesAReportTheCurrentOne)
         const char *reason;
     };
     constexpr Row rows[] = {
-        {None, None, false, false, "nobody works with reports: only the companion goes"},
+        {None, None, false, false, "reports are not in use: only the companion goes"},
         {First, First, false, true, "it is the current one already"},
         {Second, First, true, true, "it takes the place of the other"},
     };

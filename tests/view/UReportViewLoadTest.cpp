@@ -1,6 +1,7 @@
 #include "ViewFixture.h"
 
 #include "FindBar.h"
+#include "TestSize.h"
 #include "UApplication.h"
 
 #include <QClipboard>
@@ -16,10 +17,16 @@
 namespace
 {
 
-QString longText()
+/// Lines of several pieces, however fast they are loaded.
+int lineCount()
+{
+    return testSize(24'000, 60'000);
+}
+
+QString longText(int lines = lineCount())
 {
     QString text;
-    for (int line = 0; line < 60'000; ++line) {
+    for (int line = 0; line < lines; ++line) {
         text += QStringLiteral("line %1 of a long report\r\n").arg(line);
     }
     return text;
@@ -29,7 +36,7 @@ QString longText()
 class LongReport
 {
 public:
-    LongReport() : shown(longText())
+    explicit LongReport(int lines = lineCount()) : shown(longText(lines))
     {
         auto *pane = new CViewPane;
         view = showIn<UReportView>(*pane, shown.report);
@@ -44,7 +51,7 @@ public:
     LongReport &operator=(const LongReport &) = delete;
 
     kareport::ReportEdit &edit() const { return view->GetEdit(); }
-    bool isWhole() const { return !edit().isLoading() && edit().document()->blockCount() == 60'001; }
+    bool isWhole() const { return !edit().isLoading() && edit().document()->blockCount() == lineCount() + 1; }
 
     ShownReport shown;
     UReportView *view;
@@ -58,7 +65,7 @@ TEST(UReportViewLoad, ShowsTheBeginningAtOnceAndTheRestFromTheEventLoop)
     LongReport report;
     EXPECT_TRUE(report.edit().isLoading());
     EXPECT_GT(report.edit().document()->blockCount(), 100) << "more than a window shows";
-    EXPECT_LT(report.edit().document()->blockCount(), 60'000);
+    EXPECT_LT(report.edit().document()->blockCount(), lineCount());
     EXPECT_TRUE(widgetOf(*report.view).loadLabel().text().contains(u'%'));
     ASSERT_TRUE(waitUntil([&] { return !report.edit().isLoading(); }));
     EXPECT_EQ(report.edit().windowText(), longText());
@@ -68,7 +75,8 @@ TEST(UReportViewLoad, ShowsTheBeginningAtOnceAndTheRestFromTheEventLoop)
 
 TEST(UReportViewLoad, TheWindowFollowsAFewTimesASecondAndAtTheEnd)
 {
-    LongReport report;
+    constexpr int lines = 60'000; // of more pieces than the window may follow
+    LongReport report(lines);
     int told = 0;
     QObject::connect(report.edit().verticalScrollBar(), &QScrollBar::rangeChanged, &report.edit(), [&told] { ++told; });
     const QString place = widgetOf(*report.view).pageLabel().text();
@@ -80,7 +88,7 @@ TEST(UReportViewLoad, TheWindowFollowsAFewTimesASecondAndAtTheEnd)
     EXPECT_GT(pieces, 2);
     EXPECT_GE(told, 1);
     EXPECT_LE(told, 2 + time.elapsed() / 200) << "painting the window for each piece takes longer than the piece";
-    EXPECT_GT(report.edit().verticalScrollBar()->maximum(), 59'000);
+    EXPECT_GT(report.edit().verticalScrollBar()->maximum(), lines - 1000);
     const kareport::ReportViewWidget &widget = widgetOf(*report.view);
     EXPECT_TRUE(waitUntil([&widget] {
         return widget.pageLabel().text() == QStringLiteral("Page 1 of %1").arg(widget.pageCount());
@@ -96,10 +104,10 @@ TEST(UReportViewLoad, TakesNoEditUntilAllOfItIsThere)
     report.edit().paste();
     report.edit().cut();
     report.edit().undo();
-    EXPECT_EQ(report.shown.lines().size(), longText().size() - 60'000);
+    EXPECT_EQ(report.shown.lines().size(), longText().size() - lineCount());
     EXPECT_FALSE(report.shown.report.IsModified());
     ASSERT_TRUE(waitUntil([&] { return !report.edit().isLoading(); }));
-    EXPECT_FALSE(report.edit().document()->isUndoAvailable()) << "loading is no edit";
+    EXPECT_FALSE(report.edit().document()->isUndoAvailable()) << "loading is not an edit";
     QTest::keyClicks(&report.edit(), QStringLiteral("x"));
     EXPECT_TRUE(report.shown.report.IsModified());
     EXPECT_TRUE(report.shown.lines().startsWith(QStringLiteral("xline 0")));
@@ -149,11 +157,11 @@ TEST(UReportViewLoad, IsFinishedByWhatNeedsTheWholeText)
          "saving as a PDF"},
         {[](LongReport &report) {
              widgetOf(*report.view).openFindBar();
-             QTest::keyClicks(&widgetOf(*report.view).findBar().field(), QStringLiteral("59999"));
+             QTest::keyClicks(&widgetOf(*report.view).findBar().field(), QString::number(lineCount() - 1));
          },
          "finding a text"},
         {[](LongReport &report) { widgetOf(*report.view).openPageBar(); }, "asking for a page"},
-        {[](LongReport &report) { widgetOf(*report.view).goToPage(800); }, "going to a page"},
+        {[](LongReport &report) { widgetOf(*report.view).goToPage(lineCount() / 75); }, "going to a page"},
         {[](LongReport &report) { report.edit().selectAll(); }, "selecting all"},
         {[](LongReport &report) { QTest::keyClick(&report.edit(), Qt::Key_End, Qt::ControlModifier); },
          "going to the end"},
@@ -196,7 +204,7 @@ TEST(UReportViewLoad, TheTextThatGoesBackToItsObjectIsWhole)
     report.shown.report.SaveText();
     EXPECT_TRUE(report.isWhole());
     // Two bytes of the view are one character there.
-    EXPECT_GT(received.size(), longText().size() / 2 - 100'000);
+    EXPECT_GT(received.size(), longText().size() / 2 - 2 * lineCount());
     const QString whole = std::exchange(received, QString());
     report.shown.report.SaveText();
     EXPECT_TRUE(received == whole) << "as it is sent when all of it is shown";
@@ -225,10 +233,10 @@ TEST(UReportViewLoad, FollowsWhatIsTypedInAnotherViewMeanwhile)
     EXPECT_TRUE(other.GetEdit().windowText() == report.shown.report.CopyText());
 }
 
-TEST(UReportViewLoad, ChangedBehindItsBackShowsTheChange)
+TEST(UReportViewLoad, ChangedWithoutNoticeShowsTheChange)
 {
     LongReport report;
-    report.shown.report.ReplaceText(longText().size(), 0, u"last words"); // by a host that tells nobody
+    report.shown.report.ReplaceText(longText().size(), 0, u"last words"); // by a host that does not tell the views
     ASSERT_TRUE(waitUntil([&] { return !report.edit().isLoading(); }));
     EXPECT_TRUE(report.edit().windowText().endsWith(QStringLiteral("last words")));
 }
@@ -249,7 +257,7 @@ TEST(UReportViewLoad, ThatIsFinishedAfterASilentChangeHandsNoPartOfTheTextOn)
     };
     for (const Row &row : rows) {
         LongReport report;
-        report.shown.report.ReplaceText(0, 4, u"LINE"); // by a host that tells nobody
+        report.shown.report.ReplaceText(0, 4, u"LINE"); // by a host that does not tell the views
         row.act(*report.view);
         EXPECT_FALSE(report.edit().isLoading()) << row.reason;
         EXPECT_EQ(report.shown.report.GetTextLength(), longText().size()) << row.reason;
@@ -267,17 +275,19 @@ TEST(UReportViewLoad, KeepsTheUsersCursorAndSelectionWhereTheyAre)
     EXPECT_EQ(report.edit().textCursor().anchor(), end - 10);
 }
 
-TEST(UReportViewLoad, KeepsThePlaceWhereTheWindowStood)
+TEST(UReportViewLoad, KeepsThePlaceWhereTheWindowWas)
 {
     LongReport report;
     report.edit().finishLoading();
-    putCursor(report.edit(), 700'000);
-    report.edit().verticalScrollBar()->setValue(30'000);
+    const int cursor = lineCount() * 10;
+    const int top = lineCount() / 2;
+    putCursor(report.edit(), cursor);
+    report.edit().verticalScrollBar()->setValue(top);
     report.shown.report.UpdateAllViews(nullptr); // twice, as some commands do
     report.shown.report.UpdateAllViews(nullptr);
     ASSERT_TRUE(waitUntil([&] { return !report.edit().isLoading(); }));
-    EXPECT_EQ(report.edit().textCursor().position(), 700'000);
-    EXPECT_EQ(report.edit().verticalScrollBar()->value(), 30'000);
+    EXPECT_EQ(report.edit().textCursor().position(), cursor);
+    EXPECT_EQ(report.edit().verticalScrollBar()->value(), top);
 }
 
 TEST(UReportViewLoad, GoesWithAViewThatIsClosedMeanwhile)

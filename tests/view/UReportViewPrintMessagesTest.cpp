@@ -16,7 +16,7 @@ using kareport::PrintInfo;
 using testing::ElementsAre;
 using testing::IsEmpty;
 
-TEST(UReportViewPrintMessages, PrintingDirectlyAsksNobody)
+TEST(UReportViewPrintMessages, PrintingDirectlyDoesNotAsk)
 {
     AnsweredPrinting printing;
     ShownReport report;

@@ -100,7 +100,7 @@ TEST(UReportViewPrint, ThePageStartTableGrowsByThePagesThatArePrinted)
     info.maxPage = 9;
     view.OnPrint(painter, info);
     EXPECT_EQ(info.maxPage, 3) << "the text ends inside this page";
-    EXPECT_EQ(view.GetPageStarts().size(), 3U) << "no page behind the last";
+    EXPECT_EQ(view.GetPageStarts().size(), 3U) << "no page after the last";
 
     for (const int unknown : {0, -1, 4, 100}) {
         info.curPage = unknown;
@@ -250,7 +250,7 @@ TEST(UReportViewPrint, APageThatTakesNothingIsNotFollowedByOthers)
     EXPECT_THAT(view.GetPageStarts(), ElementsAre(0));
 }
 
-TEST(UReportViewPrint, ThePrintedTextStandsAtTheMarginsInItsSize)
+TEST(UReportViewPrint, ThePrintedTextIsAtTheMarginsInItsSize)
 {
     struct Row
     {

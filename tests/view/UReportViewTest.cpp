@@ -23,7 +23,7 @@ TEST(UReportView, ShowsAReportAsItsTextBegins)
         {u"one\r\ntwo", UReportView::WrapNone, u"one\ntwo", "plain text"},
         {u"\r\n", UReportView::WrapNone, u"\n", "a line end only"},
         {u"{\\rtf1 a{\\b b}\\par c}", UReportView::WrapToWindow, u"ab\nc", "rich text at the beginning"},
-        {u" {\\rtf1 a}", UReportView::WrapNone, u" {\\rtf1 a}", "rich text behind a blank is plain text"},
+        {u" {\\rtf1 a}", UReportView::WrapNone, u" {\\rtf1 a}", "rich text after a blank is plain text"},
         {u"x\r\n{\\rtf1 a}", UReportView::WrapNone, u"x\n{\\rtf1 a}", "rich text further on"},
         {u"{\\rt", UReportView::WrapNone, u"{\\rt", "a part of the beginning"},
         {u"{\\RTF1 a}", UReportView::WrapNone, u"{\\RTF1 a}", "its letters are small"},
@@ -94,7 +94,7 @@ TEST(UReportView, AnExitWithoutAFrameDefersNoClosing)
     UReportView &view = shown.open();
     shown.report.SetReportWindow(new TestReportWindow);
     view.OnReportExit();
-    EXPECT_EQ(shown.report.GetCloseDocument(), 0) << "nobody exits, and nobody would put it back later";
+    EXPECT_EQ(shown.report.GetCloseDocument(), 0) << "there is no exit, and nothing would put it back later";
 }
 
 TEST(UReportView, AViewWithoutADocument)
