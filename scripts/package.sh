@@ -19,4 +19,5 @@ mapfile -t binaries < <(find "$unpacked" -type f \( -path '*/bin/*' -o -name '*.
 scripts/check-binaries.sh "${binaries[@]}"
 mapfile -t libraries < <(find "$unpacked" -type f -name '*.so.*')
 scripts/check-exports.py "$unpacked/usr/include/KaReport" "${libraries[@]}"
+scripts/check-headers.sh "$unpacked/usr/include/KaReport"
 ls -l out/packages

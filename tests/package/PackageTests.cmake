@@ -14,6 +14,9 @@ add_test(NAME package.binaries COMMAND ${check_binaries} ${prefix}/bin/kareport 
 add_test(NAME package.exports COMMAND ${PROJECT_SOURCE_DIR}/scripts/check-exports.py
                                       ${prefix}/${CMAKE_INSTALL_INCLUDEDIR}/KaReport ${prefix_libraries})
 add_test(NAME package.exports.check COMMAND ${CMAKE_CURRENT_SOURCE_DIR}/check-exports-test.sh ${CMAKE_CXX_COMPILER})
+add_test(NAME package.listed COMMAND ${PROJECT_SOURCE_DIR}/scripts/check-headers.sh
+                                     ${prefix}/${CMAKE_INSTALL_INCLUDEDIR}/KaReport)
+add_test(NAME package.listed.check COMMAND ${CMAKE_CURRENT_SOURCE_DIR}/check-headers-test.sh)
 
 add_test(NAME package.use COMMAND ${CMAKE_CTEST_COMMAND}
          --build-and-test ${CMAKE_CURRENT_SOURCE_DIR}/package ${outside}
@@ -38,7 +41,7 @@ add_test(NAME package.example.plain COMMAND ${CMAKE_CURRENT_BINARY_DIR}/package/
 set_tests_properties(package.example PROPERTIES FIXTURES_SETUP package.examples)
 set_tests_properties(package.example.plain PROPERTIES FIXTURES_REQUIRED package.examples TIMEOUT 60
                                                       ENVIRONMENT QT_QPA_PLATFORM=offscreen)
-set_tests_properties(package.binaries package.exports package.use package.pkg-config package.example
+set_tests_properties(package.binaries package.exports package.listed package.use package.pkg-config package.example
                      PROPERTIES FIXTURES_REQUIRED package)
 add_test(NAME package.api COMMAND ${PROJECT_SOURCE_DIR}/scripts/api-docs.sh ${CMAKE_CURRENT_BINARY_DIR}/package/api)
 
