@@ -48,7 +48,7 @@ packages_package=(
     python3                 # the check of what the libraries offer
 )
 packages_office=(
-    libreoffice-writer-nogui # rich text read by somebody else; the tests use it where it is installed
+    libreoffice-writer-nogui # rich text read by another program; the tests use it where it is installed
 )
 packages_bench=(
     libbenchmark-dev        # micro benchmarks
