@@ -1,4 +1,5 @@
 #include "CommandLine.h"
+#include "TestSize.h"
 
 #include <QDateTime>
 #include <QFileInfo>
@@ -25,14 +26,14 @@ QByteArray nameOf(int job)
     return QByteArray::number(1000 + job);
 }
 
-/// Jobs that make reports of some 400 KB each, so that some are being written at any moment.
+/// Jobs that make reports of some 200 or 400 KB each, so that some are being written at any moment.
 class SharedBatch : public CommandLineFolder
 {
 public:
     SharedBatch()
     {
         QByteArray csv = "Number,Northing\n";
-        for (int i = 0; i < 20'000; ++i) {
+        for (int i = 0; i < testSize(10'000, 20'000); ++i) {
             csv += QByteArray::number(i) + ',' + QByteArray::number(i * 0.125) + '\n';
         }
         put("points.csv", csv);
@@ -80,16 +81,19 @@ private:
 };
 
 /// The reports of the batch, made in one process that is not disturbed.
-QHash<QString, QByteArray> wholeReports()
+const QHash<QString, QByteArray> &wholeReports()
 {
-    const SharedBatch batch;
-    const ProgramRun run = batch.run("render --quiet --jobs jobs.txt");
-    EXPECT_EQ(run.status, 0) << run.all().constData();
-    QHash<QString, QByteArray> reports;
-    for (const QString &name : batch.outputs()) {
-        reports.insert(name, batch.bytesOf(qPrintable(name)));
-    }
-    return reports;
+    static const QHash<QString, QByteArray> whole = [] {
+        const SharedBatch batch;
+        const ProgramRun run = batch.run("render --quiet --jobs jobs.txt");
+        EXPECT_EQ(run.status, 0) << run.all().constData();
+        QHash<QString, QByteArray> reports;
+        for (const QString &name : batch.outputs()) {
+            reports.insert(name, batch.bytesOf(qPrintable(name)));
+        }
+        return reports;
+    }();
+    return whole;
 }
 
 /// Starts a command in a process group of its own, which can be killed as a whole.
@@ -153,7 +157,7 @@ TEST(CommandLineBatch, ADistributorSpreadsIt)
     if (QStandardPaths::findExecutable(QStringLiteral("parallel")).isEmpty()) {
         GTEST_SKIP() << "GNU parallel is not installed";
     }
-    const QHash<QString, QByteArray> whole = wholeReports();
+    const QHash<QString, QByteArray> &whole = wholeReports();
     for (const Distributor &distributor : distributors()) {
         const SharedBatch batch;
         QProcess process;
@@ -169,7 +173,7 @@ TEST(CommandLineBatch, KilledAndRunAgainItIsWhole)
     if (QStandardPaths::findExecutable(QStringLiteral("parallel")).isEmpty()) {
         GTEST_SKIP() << "GNU parallel is not installed";
     }
-    const QHash<QString, QByteArray> whole = wholeReports();
+    const QHash<QString, QByteArray> &whole = wholeReports();
     for (const Distributor &distributor : distributors()) {
         const SharedBatch batch;
         int before = 0;
@@ -230,7 +234,7 @@ TEST(CommandLineBatch, KilledAndRunAgainItIsWhole)
 TEST(CommandLineBatch, StoppedItTellsWhatIsLeft)
 {
     const SharedBatch batch;
-    const QHash<QString, QByteArray> whole = wholeReports();
+    const QHash<QString, QByteArray> &whole = wholeReports();
     QProcess process;
     startGroup(process, batch.path(), QStringLiteral(KAREPORT_PROGRAM), words("render --jobs jobs.txt"));
     while (!QFileInfo::exists(batch.path((nameOf(3) + ".rep").constData())) && process.state() == QProcess::Running) {
