@@ -10,7 +10,6 @@
 #include "ReportEdit.h"
 #include "ReportOrientation.h"
 #include "ReportPrinter.h"
-#include "ReportViewWidget.h"
 #include "UPreviewDlg.h"
 #include "UReportDoc.h"
 #include "Xlate.h"
@@ -238,42 +237,4 @@ bool UReportView::OnPreparePrinting(PrintInfo &info)
         return false;
     }
     return true;
-}
-
-void UReportView::OnPageSetup()
-{
-    UReportDoc *report = GetDocument();
-    if (report == nullptr) {
-        return;
-    }
-    const auto orientation = kareport::reportOrientation();
-    if (!kareport::hasReportPrinter()) {
-        AppMessageBox(Xlate("Failed to get default printer settings."));
-        return;
-    }
-    kareport::PageSetup setup;
-    setup.margins = report->GetMargins();
-    setup.portrait = UPreviewDlg::IsModulePrinterOrientationPortrait();
-    setup.asksForPages = true;
-    setup.givenLines = report->GetGivenLinesPerPage();
-    setup.keepsGivenPages = report->IsPageFixed();
-    kareport::fillPrinters(setup);
-    const PrintedText text(*this);
-    if (!kareport::askPageSetup(setup, GetWidget()) || !text.isOpen()) {
-        return;
-    }
-    UPreviewDlg::SetModulePrinterOrientationPortrait(setup.portrait);
-    kareport::selectPrinter(setup.printer, setup.sheet);
-    report->SetMargins(setup.margins);
-    report->UseGivenPage(setup.keepsGivenPages);
-    report->SetPageSize();
-    report->SaveSettings();
-    for (UView *view : report->GetViews()) {
-        const auto *shown = dynamic_cast<UReportView *>(view);
-        if (shown != nullptr && shown->widget_) {
-            static_cast<kareport::ReportViewWidget *>(shown->widget_.data())->showPlace();
-        }
-    }
-    // After the measurement, which the next print command repeats: the report that is open keeps its pages until then.
-    SetReportPrinterSetToPortrait(UPreviewDlg::IsModulePrinterOrientationPortrait());
 }
