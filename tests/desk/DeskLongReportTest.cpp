@@ -25,13 +25,9 @@
 namespace
 {
 
-/// More lines than are read in a moment.
-int lineCount()
-{
-    return testSize(60'000, 200'000);
-}
+constexpr int lineCount = 200'000; // more than are read in a moment
 
-QByteArray longFile(int lines = lineCount(), const char *first = "TALVEN first line")
+QByteArray longFile(int lines = lineCount, const char *first = "TALVEN first line")
 {
     QByteArray content = "\xEF\xBB\xBF" + QByteArray(first) + "\r\r\n";
     for (int line = 1; line < lines; ++line) {
@@ -73,7 +69,7 @@ TEST(DeskLongReport, IsReadWhileTheWindowsAnswer)
     EXPECT_TRUE(Desk::textOf(report) == textOfFile(content));
     EXPECT_FALSE(report.IsModified());
     EXPECT_EQ(report.GetPathName(), folder.path("a.rep"));
-    EXPECT_EQ(report.GetLineCount(), lineCount());
+    EXPECT_EQ(report.GetLineCount(), lineCount);
     EXPECT_TRUE(editOf(report).isLoading()) << "the window shows its beginning";
     EXPECT_TRUE(editOf(report).isReadOnly());
     ASSERT_TRUE(isShownWhole(report));
@@ -85,7 +81,7 @@ TEST(DeskLongReport, IsReadWhileTheWindowsAnswer)
 TEST(DeskLongReport, IsWholeForWhateverNeedsItWhileItIsShownInPieces)
 {
     const JobFolder folder;
-    const QByteArray content = longFile();
+    const QByteArray content = longFile(testSize(60'000, lineCount));
     folder.put("a.rep", content);
     Desk desk;
     for (const char *name : {"b.rep", "b.rtf", "b.pdf"}) {
@@ -199,7 +195,7 @@ TEST(DeskLongReport, LeavesRoomForOthersMeanwhile)
     const QByteArray content = longFile();
     folder.put("a.rep", content);
     folder.put("b.rep", "\xEF\xBB\xBFTALVEN b\r\r\n");
-    folder.put("c.rep", longFile(lineCount(), "TALVEN c"));
+    folder.put("c.rep", longFile(lineCount, "TALVEN c"));
     Desk desk;
     meanwhile([&] {
         EXPECT_TRUE(desk.frame->OpenFile(folder.path("b.rep")));

@@ -55,8 +55,14 @@ void failEachCall(const QString &path, Prepare prepare, Save save, Failed failed
     }
 }
 
-/// A report's text of more than is buffered at once.
-inline QString longText()
+/// The lines of a report's text of more than is buffered at once.
+inline int longTextLines()
 {
-    return reportLines(QStringLiteral("a line of a report \u6E2C\n").repeated(testSize(3'000, 10'000)));
+    return testSize(2'000, 10'000);
+}
+
+inline const QString &longText()
+{
+    static const QString text = reportLines(QStringLiteral("a line of a report \u6E2C\n").repeated(longTextLines()));
+    return text;
 }

@@ -35,7 +35,7 @@ bool isFile(int descriptor)
 
 } // namespace
 
-// In the place of the C library's own, which make the same calls of the kernel.
+// In the place of the C library's own.
 extern "C" {
 
 __attribute__((visibility("default"))) ssize_t write(int descriptor, const void *bytes, std::size_t size)
@@ -50,13 +50,14 @@ __attribute__((visibility("default"))) ssize_t write(int descriptor, const void 
     }
     return syscall(SYS_write, descriptor, bytes, size);
 }
-__attribute__((visibility("default"))) int fsync(int descriptor)
+// The disk is not waited for: a file that was written is seen without that.
+__attribute__((visibility("default"))) int fsync(int /*descriptor*/)
 {
-    return refuses(Call::Flush, EIO) ? -1 : static_cast<int>(syscall(SYS_fsync, descriptor));
+    return refuses(Call::Flush, EIO) ? -1 : 0;
 }
-__attribute__((visibility("default"))) int fdatasync(int descriptor)
+__attribute__((visibility("default"))) int fdatasync(int /*descriptor*/)
 {
-    return refuses(Call::Flush, EIO) ? -1 : static_cast<int>(syscall(SYS_fdatasync, descriptor));
+    return refuses(Call::Flush, EIO) ? -1 : 0;
 }
 __attribute__((visibility("default"))) int rename(const char *from, const char *to) noexcept
 {

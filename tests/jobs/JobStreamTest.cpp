@@ -1,7 +1,4 @@
-#include "JobFolder.h"
-#include "JobReader.h"
-#include "JobRunner.h"
-#include "ReportFixture.h"
+#include "JobRunnerFixture.h"
 #include "ReportTextWriter.h"
 
 #include <QBuffer>
@@ -23,13 +20,13 @@ TEST(JobStream, EndsWithTheJobWhetherItSucceedsOrNot)
     };
     constexpr Row rows[] = {
         {R"({"line": "a"})", true, "a report that is made"},
-        {R"({"line": "a"}, {"table": "T", "data": "none"})", false, "a report that is not finished"},
+        {R"({"line": "a"}, {"table": "Points", "data": "none"})", false, "a report that is not finished"},
     };
     for (const Row &row : rows) {
         const FixedSurroundings surroundings;
         const JobFolder folder;
-        folder.put("job.json", R"({"header": false, "data": {"none": {"csv": "none.csv"}}, "report": [)" +
-                                   QByteArray(row.steps) + "]}");
+        folder.put("t.xml", jobs::pointsTemplate());
+        folder.put("job.json", jobs::fixedFront + jobs::templateJob(R"("none": {"csv": "none.csv"})", row.steps) + '}');
         const auto read = kareport::JsonSource::read(folder.path("job.json"));
         const auto &source = std::get<kareport::JsonSource>(read);
         const auto job = kareport::readJob(source);

@@ -1,4 +1,5 @@
 #include "RandomRuns.h"
+#include "TestSize.h"
 #include "TextStoreModel.h"
 
 #include <gtest/gtest.h>
@@ -13,7 +14,7 @@ using textstore::Step;
 TEST(TextStoreRandom, BehavesAsAPlainString)
 {
     constexpr std::size_t stepsPerRun = 150;
-    for (RandomRuns runs("TextStoreRandom", 1, 700); runs.next();) {
+    for (RandomRuns runs("TextStoreRandom", 1, testSize(250, 700)); runs.next();) {
         const std::vector<Step> steps = textstore::RandomSteps(runs.seed()).make(stepsPerRun);
         if (textstore::violationOf(steps)) {
             ADD_FAILURE() << "seed " << runs.seed() << ":\n" << textstore::reportOf(textstore::shortest(steps));

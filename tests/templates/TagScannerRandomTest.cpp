@@ -1,6 +1,5 @@
 #include "PrintQt.h"
 #include "TagScanner.h"
-#include "TestSize.h"
 
 #include <gtest/gtest.h>
 
@@ -101,7 +100,7 @@ std::vector<qsizetype> counted(qsizetype size)
     return numbers;
 }
 
-const int texts = testSize(12'000, 40'000);
+constexpr int texts = 40000;
 
 TEST(TagScannerRandom, CutsAsThePlainestScannerDoes)
 {
