@@ -1047,11 +1047,6 @@
     </message>
     <message>
         <location filename="../sources/csv/CsvReader.cpp"/>
-        <source>the quoted cell has no closing quote</source>
-        <translation>der Zelle in Anführungszeichen fehlt das schließende Anführungszeichen</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvReader.cpp"/>
         <source>a carriage return without a line feed was not expected</source>
         <translation>ein Wagenrücklauf (CR) ohne Zeilenvorschub (LF) wurde nicht erwartet</translation>
     </message>
@@ -1059,6 +1054,11 @@
         <location filename="../sources/csv/CsvReader.cpp"/>
         <source>the row is longer than %1 bytes: a table of rows was expected</source>
         <translation>die Zeile ist länger als %1 Byte: eine Tabelle aus Zeilen wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvReaderCells.cpp"/>
+        <source>the quoted cell has no closing quote</source>
+        <translation>der Zelle in Anführungszeichen fehlt das schließende Anführungszeichen</translation>
     </message>
     <message>
         <location filename="../sources/csv/CsvRows.cpp"/>
@@ -1182,22 +1182,22 @@
         <translation>das Objekt ist länger als %1 Bytes: eine Liste von Zeilen wurde erwartet</translation>
     </message>
     <message>
-        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <location filename="../sources/json/JsonFileValues.cpp"/>
         <source>the key "%1" occurs twice in an object</source>
         <translation>der Schlüssel "%1" steht zweimal in einem Objekt</translation>
     </message>
     <message>
-        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <location filename="../sources/json/JsonFileValues.cpp"/>
         <source>the variable "%1" occurs twice: each variable was expected once</source>
         <translation>die Variable „%1“ kommt zweimal vor: jede Variable wurde nur einmal erwartet</translation>
     </message>
     <message>
-        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <location filename="../sources/json/JsonFileValues.cpp"/>
         <source>this is not JSON: %1</source>
         <translation>das ist kein JSON: %1</translation>
     </message>
     <message>
-        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <location filename="../sources/json/JsonFileValues.cpp"/>
         <source>the value of "%1" does not fit: %2 was expected</source>
         <translation>der Wert von „%1“ passt nicht: %2 wurde erwartet</translation>
     </message>
@@ -1567,9 +1567,24 @@
         <translation>die Elemente sind tiefer als %1 ineinander geschachtelt</translation>
     </message>
     <message>
-        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
-        <source>(character %1 of the query)</source>
-        <translation>(Zeichen %1 der Abfrage)</translation>
+        <location filename="../sources/postgresql/PostgresColumns.cpp"/>
+        <source>the query has %1 parameters: values of %2 are given</source>
+        <translation>die Abfrage hat %1 Parameter: Werte von %2 sind angegeben</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresColumns.cpp"/>
+        <source>the query is not a single SELECT, which was expected</source>
+        <translation>die Abfrage ist kein einzelnes SELECT, wie es erwartet wurde</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresColumns.cpp"/>
+        <source>the columns "%1" and "%2" both have geometries: a query with one of them was expected</source>
+        <translation>die Spalten "%1" und "%2" haben beide Geometrien: eine Abfrage mit einer davon wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresColumns.cpp"/>
+        <source>no column is a variable of the dictionary: there are %1</source>
+        <translation>keine Spalte ist eine Variable des Wörterbuchs: vorhanden sind %1</translation>
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresConnection.cpp"/>
@@ -1612,24 +1627,9 @@
         <translation>die Datenbank beantwortet die Abfrage nicht: %1</translation>
     </message>
     <message>
-        <location filename="../sources/postgresql/PostgresRows.cpp"/>
-        <source>the query has %1 parameters: values of %2 are given</source>
-        <translation>die Abfrage hat %1 Parameter: Werte von %2 sind angegeben</translation>
-    </message>
-    <message>
-        <location filename="../sources/postgresql/PostgresRows.cpp"/>
-        <source>the query is not a single SELECT, which was expected</source>
-        <translation>die Abfrage ist kein einzelnes SELECT, wie es erwartet wurde</translation>
-    </message>
-    <message>
-        <location filename="../sources/postgresql/PostgresRows.cpp"/>
-        <source>the columns "%1" and "%2" both have geometries: a query with one of them was expected</source>
-        <translation>die Spalten "%1" und "%2" haben beide Geometrien: eine Abfrage mit einer davon wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../sources/postgresql/PostgresRows.cpp"/>
-        <source>no column is a variable of the dictionary: there are %1</source>
-        <translation>keine Spalte ist eine Variable des Wörterbuchs: vorhanden sind %1</translation>
+        <location filename="../sources/postgresql/PostgresResult.cpp"/>
+        <source>(character %1 of the query)</source>
+        <translation>(Zeichen %1 der Abfrage)</translation>
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresRows.cpp"/>
@@ -1645,6 +1645,11 @@
         <location filename="../sources/postgresql/PostgresRows.cpp"/>
         <source>row %1: </source>
         <translation>Zeile %1: </translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteColumns.cpp"/>
+        <source>the database has no table "%1"</source>
+        <translation>die Datenbank hat keine Tabelle "%1"</translation>
     </message>
     <message>
         <location filename="../sources/sqlite/SqliteFile.cpp"/>
@@ -1695,11 +1700,6 @@
         <location filename="../sources/sqlite/SqliteFile.cpp"/>
         <source>the database was changed while it was read, by a program that does not use SQLite</source>
         <translation>die Datenbank wurde beim Lesen verändert, von einem Programm, das nicht SQLite verwendet</translation>
-    </message>
-    <message>
-        <location filename="../sources/sqlite/SqliteRows.cpp"/>
-        <source>the database has no table "%1"</source>
-        <translation>die Datenbank hat keine Tabelle "%1"</translation>
     </message>
     <message>
         <location filename="../jobs/ColumnChoices.cpp"/>

@@ -1047,11 +1047,6 @@
     </message>
     <message>
         <location filename="../sources/csv/CsvReader.cpp"/>
-        <source>the quoted cell has no closing quote</source>
-        <translation>引用符で始まるセルに終わりの引用符がありません</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvReader.cpp"/>
         <source>a carriage return without a line feed was not expected</source>
         <translation>改行 (LF) を伴わない復帰 (CR) は使えません</translation>
     </message>
@@ -1059,6 +1054,11 @@
         <location filename="../sources/csv/CsvReader.cpp"/>
         <source>the row is longer than %1 bytes: a table of rows was expected</source>
         <translation>行が %1 バイトを超えています: 行からなる表が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvReaderCells.cpp"/>
+        <source>the quoted cell has no closing quote</source>
+        <translation>引用符で始まるセルに終わりの引用符がありません</translation>
     </message>
     <message>
         <location filename="../sources/csv/CsvRows.cpp"/>
@@ -1182,22 +1182,22 @@
         <translation>オブジェクトが %1 バイトより長いです: 行の一覧が必要です</translation>
     </message>
     <message>
-        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <location filename="../sources/json/JsonFileValues.cpp"/>
         <source>the key "%1" occurs twice in an object</source>
         <translation>キー "%1" がオブジェクトに 2 回あります</translation>
     </message>
     <message>
-        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <location filename="../sources/json/JsonFileValues.cpp"/>
         <source>the variable "%1" occurs twice: each variable was expected once</source>
         <translation>変数「%1」が 2 回あります: 変数はそれぞれ 1 回だけ指定できます</translation>
     </message>
     <message>
-        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <location filename="../sources/json/JsonFileValues.cpp"/>
         <source>this is not JSON: %1</source>
         <translation>これは JSON ではありません: %1</translation>
     </message>
     <message>
-        <location filename="../sources/json/JsonFileRows.cpp"/>
+        <location filename="../sources/json/JsonFileValues.cpp"/>
         <source>the value of "%1" does not fit: %2 was expected</source>
         <translation>「%1」の値が不正です: %2が必要です</translation>
     </message>
@@ -1567,9 +1567,24 @@
         <translation>要素の入れ子が %1 段を超えています</translation>
     </message>
     <message>
-        <location filename="../sources/postgresql/PostgresConnection.cpp"/>
-        <source>(character %1 of the query)</source>
-        <translation>(クエリの %1 文字目)</translation>
+        <location filename="../sources/postgresql/PostgresColumns.cpp"/>
+        <source>the query has %1 parameters: values of %2 are given</source>
+        <translation>クエリにはパラメーターが %1 個あります: 与えられた値は %2 個です</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresColumns.cpp"/>
+        <source>the query is not a single SELECT, which was expected</source>
+        <translation>クエリは単一の SELECT ではありません。単一の SELECT が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresColumns.cpp"/>
+        <source>the columns "%1" and "%2" both have geometries: a query with one of them was expected</source>
+        <translation>列 "%1" と "%2" の両方にジオメトリがあります: そのうち 1 つだけを含むクエリが必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresColumns.cpp"/>
+        <source>no column is a variable of the dictionary: there are %1</source>
+        <translation>辞書の変数である列がありません: あるのは %1 です</translation>
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresConnection.cpp"/>
@@ -1612,24 +1627,9 @@
         <translation>データベースがクエリに応答しません: %1</translation>
     </message>
     <message>
-        <location filename="../sources/postgresql/PostgresRows.cpp"/>
-        <source>the query has %1 parameters: values of %2 are given</source>
-        <translation>クエリにはパラメーターが %1 個あります: 与えられた値は %2 個です</translation>
-    </message>
-    <message>
-        <location filename="../sources/postgresql/PostgresRows.cpp"/>
-        <source>the query is not a single SELECT, which was expected</source>
-        <translation>クエリは単一の SELECT ではありません。単一の SELECT が必要です</translation>
-    </message>
-    <message>
-        <location filename="../sources/postgresql/PostgresRows.cpp"/>
-        <source>the columns "%1" and "%2" both have geometries: a query with one of them was expected</source>
-        <translation>列 "%1" と "%2" の両方にジオメトリがあります: そのうち 1 つだけを含むクエリが必要です</translation>
-    </message>
-    <message>
-        <location filename="../sources/postgresql/PostgresRows.cpp"/>
-        <source>no column is a variable of the dictionary: there are %1</source>
-        <translation>辞書の変数である列がありません: あるのは %1 です</translation>
+        <location filename="../sources/postgresql/PostgresResult.cpp"/>
+        <source>(character %1 of the query)</source>
+        <translation>(クエリの %1 文字目)</translation>
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresRows.cpp"/>
@@ -1645,6 +1645,11 @@
         <location filename="../sources/postgresql/PostgresRows.cpp"/>
         <source>row %1: </source>
         <translation>行 %1: </translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteColumns.cpp"/>
+        <source>the database has no table "%1"</source>
+        <translation>データベースに表 "%1" はありません</translation>
     </message>
     <message>
         <location filename="../sources/sqlite/SqliteFile.cpp"/>
@@ -1695,11 +1700,6 @@
         <location filename="../sources/sqlite/SqliteFile.cpp"/>
         <source>the database was changed while it was read, by a program that does not use SQLite</source>
         <translation>読み取り中に、SQLite を使わないプログラムによってデータベースが変更されました</translation>
-    </message>
-    <message>
-        <location filename="../sources/sqlite/SqliteRows.cpp"/>
-        <source>the database has no table "%1"</source>
-        <translation>データベースに表 "%1" はありません</translation>
     </message>
     <message>
         <location filename="../jobs/ColumnChoices.cpp"/>
