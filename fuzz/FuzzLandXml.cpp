@@ -1,3 +1,4 @@
+#include "LandXmlContents.h"
 #include "LandXmlList.h"
 #include "VariableType.h"
 
@@ -47,6 +48,56 @@ void readThrough(const std::shared_ptr<const FileBytes> &file, const LandXmlQuer
     }
 }
 
+/// A query with all that a list may be asked for, but for names.
+LandXmlQuery queryOf(LandXmlListKind kind, std::size_t size)
+{
+    LandXmlQuery query;
+    query.kind = kind;
+    query.interval = 10;
+    query.fromRound = size % 2 == 0;
+    query.offsets = {{-5, -2.5}, {5, std::nullopt}};
+    query.stations = {0, 100.5};
+    return query;
+}
+
+/// Some of the names of a file: the first and the last.
+QStringList someOf(const std::vector<LandXmlNamed> &names)
+{
+    QStringList some;
+    if (!names.empty()) {
+        some.append(names.front().name);
+        some.append(names.back().name);
+    }
+    return some;
+}
+
+/// Asks for what a list has by its name, as a user does who chooses among the names in the file.
+void readNamed(const std::shared_ptr<const FileBytes> &file, std::size_t size)
+{
+    const auto read = readLandXmlContents(file, {});
+    const auto *contents = std::get_if<LandXmlContents>(&read);
+    if (contents == nullptr) {
+        return;
+    }
+    using Kind = LandXmlListKind;
+    const auto ask = [&](Kind kind, const std::vector<LandXmlNamed> &names, QString LandXmlQuery::*member) {
+        for (const QString &name : someOf(names)) {
+            LandXmlQuery query = queryOf(kind, size);
+            query.*member = name;
+            readThrough(file, query);
+        }
+    };
+    ask(Kind::Points, contents->groups, &LandXmlQuery::name);
+    ask(Kind::SurfacePoints, contents->surfaces, &LandXmlQuery::name);
+    ask(Kind::Courses, contents->parcels, &LandXmlQuery::name);
+    ask(Kind::Elements, contents->alignments, &LandXmlQuery::name);
+    ask(Kind::OffsetsOf, contents->alignments, &LandXmlQuery::alignment);
+    ask(Kind::Stations, contents->gradeLines, &LandXmlQuery::gradeLine);
+    ask(Kind::Profile, contents->gradeLines, &LandXmlQuery::gradeLine);
+    ask(Kind::Stations, contents->surfaceLines, &LandXmlQuery::surface);
+    ask(Kind::CrossSections, contents->surfaceLines, &LandXmlQuery::surface);
+}
+
 } // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t *data, std::size_t size)
@@ -56,13 +107,9 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t *data, std::size_t size
     for (const char *key : {"points", "surfacePoints", "parcels", "courses", "alignments", "elements", "stations",
                             "profile", "crossSections", "offsetsOf"})
     {
-        LandXmlQuery query;
-        query.kind = *landXmlListFromKey(QString::fromLatin1(key));
-        query.interval = 10;
-        query.fromRound = size % 2 == 0;
-        query.offsets = {{-5, -2.5}, {5, std::nullopt}};
-        query.stations = {0, 100.5};
-        readThrough(file, query);
+        readThrough(file, queryOf(*landXmlListFromKey(QString::fromLatin1(key)), size));
     }
+    isLandXml(file);
+    readNamed(file, size);
     return 0;
 }

@@ -64,7 +64,9 @@ void LandXmlList::bind(const FindVariable &findVariable)
     QStringList known;
     for (const LandXmlVariable &variable : rows_->variables()) {
         if (const auto parser = findVariable(variable.name)) {
-            columns_.push_back({*parser, names_.size()});
+            const bool isFirst = std::none_of(columns_.begin(), columns_.end(),
+                                              [&](const Column &column) { return column.parser.id() == parser->id(); });
+            columns_.push_back({*parser, names_.size(), isFirst});
         }
         names_.push_back(variable.name);
         known.append(variable.name);
@@ -156,16 +158,15 @@ bool LandXmlList::readRow(RowBatch &batch)
 /// Stores the values of the row at hand. @return what is wrong with one
 std::optional<InputError> LandXmlList::storeValues(UDataObject &object, const std::vector<unsigned> *onlyIds) const
 {
-    // The object may hold the values of an earlier row; two variables may have one identifier.
-    for (const Column &column : columns_) {
-        object.Remove(column.parser.id());
-    }
     for (const Column &column : columns_) {
         const ValueParser &parser = column.parser;
         if (onlyIds != nullptr && std::find(onlyIds->begin(), onlyIds->end(), parser.id()) == onlyIds->end()) {
             continue;
         }
         const LandXmlValue value = rows_->value(column.variable);
+        if (column.isFirst && std::holds_alternative<std::monostate>(value)) {
+            object.Remove(parser.id()); // of an earlier row
+        }
         bool fits = true;
         if (const auto *number = std::get_if<double>(&value)) {
             fits = parser.storeNumber(*number, object);

@@ -47,6 +47,7 @@ private:
     {
         ValueParser parser;
         std::size_t variable;
+        bool isFirst; ///< of those with its identifier
     };
 
     void bind(const FindVariable &findVariable);

@@ -139,12 +139,7 @@ XmlHandler::Interest LandXmlReader::beginInAlignment(Tag tag, const XmlAttribute
     case Tag::Start:
     case Tag::End:
     case Tag::Centre:
-    case Tag::Intersection: {
-        LandXmlCoordinates &at = coordinatesOf(tag);
-        startCoordinates(at, attributes);
-        at.name = attributes.text("name");
-        return Interest::Text;
-    }
+    case Tag::Intersection: startCoordinates(coordinatesOf(tag), attributes); return Interest::Text;
     case Tag::PointList2:
     case Tag::PointList3: return isListRead() ? Interest::Text : Interest::Parts;
     default: return Interest::Parts;

@@ -40,7 +40,7 @@ public:
     /// The number of points that were read since they were dropped, and each of them in the order of the file.
     std::size_t pointCount() const { return pointCount_; }
     const LandXmlPoint &point(std::size_t index) const { return points_[index]; }
-    void dropPoints() { pointCount_ = 0; }
+    void dropPoints();
     /// The names of groups and surfaces, by the points' owners.
     const std::vector<std::string> &owners() const { return owners_; }
     bool isSurface(std::size_t owner) const { return isSurface_[owner]; }
@@ -116,8 +116,9 @@ private:
     std::string text_;
     std::size_t textByte_ = 0;
     std::vector<double> numbers_;
-    LandXmlPoint point_;               ///< that is read; the file's next piece may be needed for its end
-    std::vector<LandXmlPoint> points_; ///< more than are in use, for their texts' memory
+    /// One more than there are, which is read: the file's next piece may be needed for its end. More than that are there for
+    /// the memory of their texts.
+    std::vector<LandXmlPoint> points_{1};
     std::size_t pointCount_ = 0;
     std::vector<std::string> owners_;
     std::vector<bool> isSurface_;         ///< of the owners

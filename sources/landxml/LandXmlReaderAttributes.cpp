@@ -21,18 +21,33 @@ void LandXmlReader::beginAlignment(const XmlAttributes &attributes)
     alignment.byte = stream_.currentByte();
 }
 
+/// Begins a point. A file has most of them, so that its attributes are gone through once.
 void LandXmlReader::beginPoint(Tag tag, const XmlAttributes &attributes)
 {
-    LandXmlPoint &point = point_;
-    point.name = attributes.text("name");
-    point.id = attributes.text(tag == Tag::Point ? "oID" : "id");
+    LandXmlPoint &point = points_[pointCount_];
+    for (std::string *text : {&point.name, &point.id, &point.code, &point.description, &point.at.reference}) {
+        text->clear();
+    }
+    const std::string_view id = tag == Tag::Point ? "oID" : "id";
+    for (const char *const *pair = attributes.pairs(); *pair != nullptr; pair += 2) {
+        const std::string_view key = *pair;
+        std::string *text = key == "name"     ? &point.name
+                            : key == "code"   ? &point.code
+                            : key == "desc"   ? &point.description
+                            : key == id       ? &point.id
+                            : key == "pntRef" ? &point.at.reference
+                                              : nullptr;
+        if (text != nullptr) {
+            *text = pair[1];
+        }
+    }
     if (point.name.empty() || tag == Tag::SurfacePoint) {
         std::swap(point.name, point.id);
     }
-    point.code = attributes.text("code");
-    point.description = attributes.text("desc");
     point.owner = openOwners_.back();
-    startCoordinates(point.at, attributes);
+    point.at.position.reset();
+    point.at.height = notGiven;
+    point.at.byte = stream_.currentByte();
 }
 
 /// Begins coordinates, without the name that they may have.
@@ -42,6 +57,7 @@ void LandXmlReader::startCoordinates(LandXmlCoordinates &at, const XmlAttributes
     at.position.reset();
     at.height = notGiven;
     at.reference = attributes.text("pntRef");
+    at.name = attributes.text("name");
     at.byte = stream_.currentByte();
 }
 

@@ -32,7 +32,7 @@ void LandXmlReader::end(Tag tag)
     switch (tag) {
     case Tag::Point:
     case Tag::SurfacePoint:
-        takeCoordinates(point_.at);
+        takeCoordinates(points_[pointCount_].at);
         if (!stream_.error()) {
             addPoint();
         }
@@ -62,10 +62,17 @@ void LandXmlReader::end(Tag tag)
 
 void LandXmlReader::addPoint()
 {
-    if (pointCount_ == points_.size()) {
+    if (++pointCount_ == points_.size()) {
         points_.emplace_back();
     }
-    std::swap(points_[pointCount_++], point_); // the texts' memory is used again
+}
+
+void LandXmlReader::dropPoints()
+{
+    if (pointCount_ > 0) {
+        std::swap(points_.front(), points_[pointCount_]);
+        pointCount_ = 0;
+    }
 }
 
 /// Reads the text as numbers with blanks between them. A sign that a line end separates from its number belongs to it.

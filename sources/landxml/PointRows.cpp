@@ -89,7 +89,18 @@ bool PointRows::readMore()
             isOwnerWanted_.push_back(reader_->isSurface(owner) == isOfSurfaces() && isNamed(owners_.back()));
         }
     }
+    hashes_.clear();
+    for (std::size_t i = 0; i < reader_->pointCount(); ++i) {
+        hashes_.push_back(hashOf(reader_->point(i)));
+        seen_.prepare(hashes_.back());
+    }
     return reader_->pointCount() > 0;
+}
+
+std::uint64_t PointRows::hashOf(const LandXmlPoint &point) const
+{
+    const std::uint64_t hash = std::hash<std::string>()(point.name);
+    return isOfSurfaces() ? (hash ^ point.owner) * 0x9E3779B97F4A7C15U : hash;
 }
 
 bool PointRows::next()
@@ -157,11 +168,7 @@ void PointRows::noteNames()
     if (point_->name.empty() || (referred_ && reference == point_->name)) {
         return;
     }
-    std::size_t hash = std::hash<std::string>()(point_->name);
-    if (isOfSurfaces()) {
-        hash = (hash ^ point_->owner) * 0x9E3779B97F4A7C15U;
-    }
-    if (!seen_.insert(hash).second) {
+    if (!seen_.add(hashes_[index_ - 1])) {
         passNotes_.add(point_->at.byte,
                        Xlate("several points have the name \"%1\"").arg(QString::fromStdString(point_->name)));
     }

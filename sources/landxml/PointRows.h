@@ -1,8 +1,7 @@
 #pragma once
 
 #include "LandXmlRows.h"
-
-#include <unordered_set>
+#include "SeenHashes.h"
 
 namespace kareport
 {
@@ -44,6 +43,7 @@ private:
 
     bool readMore();
     bool isOfSurfaces() const { return source_.query.kind == LandXmlListKind::SurfacePoints; }
+    std::uint64_t hashOf(const LandXmlPoint &point) const;
     void noteNames();
 
     LandXmlNotes unheard_;
@@ -54,7 +54,8 @@ private:
     std::vector<bool> isOwnerWanted_;
     bool isKept_ = false;
     std::vector<LandXmlPoint> kept_;
-    std::unordered_set<std::size_t> seen_; ///< hashes of names
+    SeenHashes seen_;                   ///< of names
+    std::vector<std::uint64_t> hashes_; ///< of the names of the points that were read
 };
 
 } // namespace kareport

@@ -26,8 +26,9 @@ QString utf8(std::string_view text)
 
 std::optional<std::string_view> XmlAttributes::find(std::string_view name) const
 {
+    // Most names differ in their first letter.
     for (const char *const *pair = pairs_; *pair != nullptr; pair += 2) {
-        if (name == *pair) {
+        if (**pair == name.front() && name == *pair) {
             return pair[1];
         }
     }
@@ -64,11 +65,7 @@ struct XmlStream::Callbacks
 
     static void text(void *data, const char *characters, int count)
     {
-        if (static_cast<XmlStream *>(data)->wantsText_) {
-            guarded(data, [&](XmlStream &stream) {
-                stream.handler_.text({characters, static_cast<std::size_t>(count)});
-            });
-        }
+        guarded(data, [&](XmlStream &stream) { stream.handler_.text({characters, static_cast<std::size_t>(count)}); });
     }
 
     static void documentType(void *data, const char *, const char *file, const char *, int)
@@ -130,7 +127,6 @@ XmlStream::XmlStream(std::shared_ptr<const FileBytes> file, XmlHandler &handler)
     }
     XML_SetUserData(parser_, this);
     XML_SetElementHandler(parser_, Callbacks::start, Callbacks::end);
-    XML_SetCharacterDataHandler(parser_, Callbacks::text);
     XML_SetStartDoctypeDeclHandler(parser_, Callbacks::documentType);
     XML_SetEntityDeclHandler(parser_, Callbacks::entity);
     XML_SetSkippedEntityHandler(parser_, Callbacks::skippedEntity);
@@ -214,7 +210,7 @@ void XmlStream::started(const char *name, const char *const *attributes)
     if (passedOverFrom_ != 0) {
         return;
     }
-    wantsText_ = false;
+    wantText(false);
     const XmlAttributes found(attributes);
     vocabulary_.begin(name, attributes, depth_);
     if (!vocabulary_.has(name)) {
@@ -227,7 +223,7 @@ void XmlStream::started(const char *name, const char *const *attributes)
         local.remove_prefix(colon + 1);
     }
     const auto interest = handler_.startElement(local, found);
-    wantsText_ = interest == XmlHandler::Interest::Text;
+    wantText(interest == XmlHandler::Interest::Text);
     textWanted_.set(static_cast<std::size_t>(depth_), wantsText_);
     if (interest == XmlHandler::Interest::None) {
         passedOverFrom_ = depth_;
@@ -244,7 +240,16 @@ void XmlStream::ended()
     vocabulary_.end(depth_);
     --depth_;
     // The text after an element belongs to the one around it.
-    wantsText_ = passedOverFrom_ == 0 && textWanted_.test(static_cast<std::size_t>(depth_));
+    wantText(passedOverFrom_ == 0 && textWanted_.test(static_cast<std::size_t>(depth_)));
+}
+
+/// Has the parser tell text or leave it out: most text of a file belongs to elements of which nothing is wanted.
+void XmlStream::wantText(bool isWanted)
+{
+    if (isWanted != wantsText_) {
+        wantsText_ = isWanted;
+        XML_SetCharacterDataHandler(parser_, isWanted ? Callbacks::text : nullptr);
+    }
 }
 
 } // namespace kareport

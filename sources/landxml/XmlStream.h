@@ -26,6 +26,7 @@ public:
     explicit XmlAttributes(const char *const *pairs) : pairs_(pairs) {}
 
     /// The value of an attribute; nothing where the element has none of the name. Names with a prefix are found with it.
+    /// @param name  not empty
     std::optional<std::string_view> find(std::string_view name) const;
     /// The value, or an empty text.
     std::string_view text(std::string_view name) const { return find(name).value_or(std::string_view()); }
@@ -93,6 +94,7 @@ private:
 
     void started(const char *name, const char *const *attributes);
     void ended();
+    void wantText(bool isWanted);
     void failParsing();
 
     std::shared_ptr<const FileBytes> file_;

@@ -40,6 +40,9 @@ void XmlVocabulary::begin(std::string_view name, const char *const *pairs, int d
         }
     }
     for (const char *const *pair = pairs; *pair != nullptr; pair += 2) {
+        if (pair[0][0] != 'x') {
+            continue; // as nearly all are
+        }
         if (const auto prefix = declaredPrefix(pair[0])) {
             auto known = prefixes_.find(*prefix);
             if (known == prefixes_.end()) {
@@ -47,6 +50,7 @@ void XmlVocabulary::begin(std::string_view name, const char *const *pairs, int d
             }
             known->second.push_back(uri_ == pair[1]);
             open_.push_back({&known->second, depth});
+            root_ = *prefix == rootPrefix_ ? &known->second : root_;
         }
     }
 }
@@ -62,9 +66,13 @@ void XmlVocabulary::end(int depth)
 bool XmlVocabulary::has(std::string_view name) const
 {
     const std::string_view prefix = prefixOf(name);
-    const auto known = prefixes_.find(prefix);
-    const bool isDeclared = known != prefixes_.end() && !known->second.empty();
-    return isDeclared ? known->second.back() : prefix == rootPrefix_;
+    const Declarations *declarations = root_;
+    if (prefix != rootPrefix_) {
+        const auto known = prefixes_.find(prefix);
+        declarations = known != prefixes_.end() ? &known->second : nullptr;
+    }
+    const bool isDeclared = declarations != nullptr && !declarations->empty();
+    return isDeclared ? declarations->back() : prefix == rootPrefix_;
 }
 
 } // namespace kareport

@@ -42,7 +42,8 @@ private:
     std::string uri_; ///< of the vocabulary; empty where the outermost element has none
     std::string rootPrefix_;
     Prefixes prefixes_;
-    std::vector<Open> open_; ///< all declarations that hold, in turn
+    const Declarations *root_ = nullptr; ///< those of the outermost element's prefix, which most elements have
+    std::vector<Open> open_;             ///< all declarations that hold, in turn
 };
 
 } // namespace kareport
