@@ -82,6 +82,9 @@ void UXTPMDIFrameWnd::TakePane(COneViewPane &pane)
     std::erase(usedPanes_, &pane);
     usedPanes_.push_back(&pane);
     activePane_ = &pane;
+    if (!pane.IsInFront()) {
+        SettleLater(); // the layout has not brought it to the front: it is the active one only if that comes
+    }
     if (UView *view = pane.GetActiveView()) {
         activate(activeView_, view);
     }

@@ -108,10 +108,11 @@ bool PaneDock::isBehindTab() const
 void PaneDock::comeToFront()
 {
     raise();
-    if (isWindow() || parentWidget() == nullptr || parentWidget() == frameOf(*this)) {
+    if (isWindow() || parentWidget() == nullptr) {
         return;
     }
-    // Raising changes the tab only where the frame is the parent, not in a window in which panes float as tabs.
+    // Raising changes the tab only where the frame is the parent, not in a window in which panes float as tabs, and only
+    // where the dock widget is not above its siblings already, which those behind a tab can be as well.
     for (QTabBar *tabs : parentWidget()->findChildren<QTabBar *>(QString(), Qt::FindDirectChildrenOnly)) {
         for (int tab = 0; tab < tabs->count(); ++tab) {
             if (tabs->tabData(tab).value<quintptr>() == reinterpret_cast<quintptr>(this)) {
@@ -119,7 +120,9 @@ void PaneDock::comeToFront()
             }
         }
     }
-    parentWidget()->raise();
+    if (parentWidget() != frameOf(*this)) {
+        parentWidget()->raise();
+    }
 }
 
 void PaneDock::setVisible(bool visible)

@@ -4,6 +4,7 @@
 #include "DeskPreferences.h"
 
 #include <QClipboard>
+#include <QDialog>
 
 #include <gtest/gtest.h>
 
@@ -91,6 +92,49 @@ TEST(ActivePaneDesk, ACancelledExitLeavesEveryReportAsItWas)
                 EXPECT_FALSE(UReportDoc::IsReportAvailable(report)) << cancelledAt << ": and can be closed";
             }
         }
+    }
+}
+
+TEST(ActivePaneDesk, AfterARefusedExitTheActiveViewIsSeen)
+{
+    for (const bool isAbove : {false, true}) {
+        Desk desk;
+        const JobFolder folder;
+        std::vector<UReportDoc *> reports;
+        for (const char *name : {"a.rep", "b.rep", "c.rep"}) {
+            folder.put(name, savedText(name));
+            ASSERT_TRUE(desk.frame->OpenFile(folder.path(name)));
+            settle();
+            reports.push_back(Desk::reports().back());
+        }
+        // The last one floats and has the keyboard; in the frame, the first one had it, and the second one is in front.
+        dockPaneOf(*reports[2]).GetDock()->setFloating(true);
+        ASSERT_TRUE(clickTab(*desk.frame, dockPaneOf(*reports[1])));
+        dockPaneOf(*reports[2]).GetDock()->activateWindow();
+        settle();
+        editOf(*reports[0]).setFocus();
+        ASSERT_FALSE(dockPaneOf(*reports[0]).IsInFront());
+        ASSERT_EQ(desk.frame->GetCommandDocument(), reports[2]);
+        reports[2]->SetModifiedFlag(true);
+        setMessageBox([&](const Message &) {
+            {
+                QDialog question(&*desk.frame);
+                question.show();
+                settle();
+            }
+            settle();
+            if (isAbove) {
+                putAboveSiblings(*dockPaneOf(*reports[0]).GetDock());
+            }
+            desk.frame->activateWindow(); // as a window manager does when the question has gone
+            settle();
+            return MessageAnswer::Cancel;
+        });
+        desk.frame->close();
+        settle();
+        ASSERT_TRUE(desk.frame->isVisible());
+        EXPECT_EQ(wrongWithActive(*desk.frame), QString()) << isAbove;
+        setMessageBox([](const Message &) { return MessageAnswer::No; });
     }
 }
 

@@ -31,6 +31,25 @@ kareport::ReportEdit &editOf(const UReportDoc &report, std::size_t view)
     return dynamic_cast<UReportView &>(*report.GetViews().at(view)).GetEdit();
 }
 
+namespace
+{
+
+/// Lets nothing learn that a widget has come above others.
+class UnseenOrder : public QObject
+{
+protected:
+    bool eventFilter(QObject *, QEvent *event) override { return event->type() == QEvent::ZOrderChange; }
+};
+
+} // namespace
+
+void putAboveSiblings(QDockWidget &dock)
+{
+    UnseenOrder unseen;
+    dock.installEventFilter(&unseen);
+    dock.raise();
+}
+
 QString wrongWithActive(const UXTPMDIFrameWnd &frame)
 {
     const COneViewPane *pane = frame.GetActivePane();

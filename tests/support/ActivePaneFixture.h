@@ -19,5 +19,8 @@ COneViewPane &dockPaneOf(const UReportDoc &report, std::size_t view = 0);
 
 kareport::ReportEdit &editOf(const UReportDoc &report, std::size_t view = 0);
 
+/// Puts a dock widget above its siblings, and leaves the tabs as they are: so docking and floating leave it at times.
+void putAboveSiblings(QDockWidget &dock);
+
 /// What is wrong with the active pane and view of a frame; empty when they are what the user sees and types into.
 QString wrongWithActive(const UXTPMDIFrameWnd &frame);

@@ -102,6 +102,45 @@ TEST_F(ActivePane, WhateverBringsAPaneToTheFrontMakesItTheActiveOne)
     EXPECT_EQ(desk.frame->GetActiveView(), nullptr);
 }
 
+TEST_F(ActivePane, APaneThatIsAboveItsSiblingsAlreadyComesBeforeTheOtherTabs)
+{
+    const std::function<void()> acts[] = {
+        [this] { pane(0).BringToTop(); },
+        [this] { desk.frame->SetActiveViewForFrameAndPane(reports[0]->GetViews().front()); },
+        [this] { pane(0).ShowPane(true); },
+    };
+    for (const auto &act : acts) {
+        ASSERT_TRUE(clickTab(*desk.frame, pane(2)));
+        WindowDesk::settle();
+        putAboveSiblings(*pane(0).GetDock());
+        ASSERT_FALSE(pane(0).IsInFront());
+        act();
+        WindowDesk::settle();
+        expectActive(*reports[0], "which raising alone does not bring to the front");
+    }
+}
+
+TEST_F(ActivePane, ThePaneThatTheKeyboardComesBackToIsSeen)
+{
+    // The frame remembers the widget that had the keyboard, also when its pane is behind a tab since.
+    ASSERT_TRUE(clickTab(*desk.frame, pane(0)));
+    pane(2).GetDock()->setFloating(true);
+    pane(2).GetDock()->activateWindow();
+    WindowDesk::settle();
+    ASSERT_TRUE(clickTab(*desk.frame, pane(1)));
+    pane(2).GetDock()->activateWindow();
+    WindowDesk::settle();
+    expectActive(*reports[2], "the window of its own");
+    editOf(*reports[0]).setFocus();
+    putAboveSiblings(*pane(0).GetDock());
+    ASSERT_FALSE(pane(0).IsInFront());
+    desk.application->SetCurrentReport(reports[2]);
+    desk.frame->activateWindow();
+    WindowDesk::settle();
+    WindowDesk::settle();
+    EXPECT_EQ(wrongWithActive(*desk.frame), QString());
+}
+
 /// Records the notifications of being active.
 class ToldView : public UReportView
 {
