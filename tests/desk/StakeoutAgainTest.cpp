@@ -2,13 +2,18 @@
 
 #include "CrashFolder.h"
 #include "FrameFixture.h"
+#include "PageBar.h"
+#include "ReportEdit.h"
 #include "ReportFixture.h"
 #include "ReportPages.h"
+#include "ReportViewWidget.h"
 #include "SavedReports.h"
 #include "StakeoutSheets.h"
 #include "UReportView.h"
 
 #include <QBuffer>
+#include <QSpinBox>
+#include <QTextBlock>
 
 #include <gtest/gtest.h>
 
@@ -26,7 +31,24 @@ UReportDoc *runStakeout(Desk &desk)
     return Desk::reports().empty() ? nullptr : Desk::reports().front();
 }
 
-/// What is printed of a report that was opened again, and its PDF, have the pages of the job.
+/// Goes to each page as a user does, with Ctrl+G and the number.
+void expectPagesToGoTo(UReportView &view)
+{
+    auto &widget = *static_cast<kareport::ReportViewWidget *>(view.GetWidget());
+    EXPECT_EQ(widget.pageCount(), pagesOfStakeout);
+    for (int page = pagesOfStakeout; page >= 1; --page) {
+        QTest::keyClick(&widget.edit(), Qt::Key_G, Qt::ControlModifier);
+        ASSERT_TRUE(widget.pageBar().isVisibleTo(&widget));
+        QTest::keyClicks(&widget.pageBar().page(), QString::number(page));
+        QTest::keyClick(&widget.pageBar().page(), Qt::Key_Return);
+        const QString line = widget.edit().textCursor().block().text();
+        EXPECT_TRUE(line.startsWith(QStringLiteral("TALVEN Survey - Stakeout"))) << line.toStdString();
+        EXPECT_EQ(line.section(QStringLiteral("Page:"), 1).trimmed(), QString::number(page));
+        EXPECT_EQ(widget.currentPage(), page);
+    }
+}
+
+/// What is printed of a report that was opened again, its PDF, and Go to Page have the pages of the job.
 void expectPagesOfTheJob(UReportDoc *report)
 {
     ASSERT_NE(report, nullptr);
@@ -39,10 +61,11 @@ void expectPagesOfTheJob(UReportDoc *report)
     expectStakeoutPages(pdf.data(), "the PDF");
     auto *view = dynamic_cast<UReportView *>(report->GetViews().front());
     ASSERT_NE(view, nullptr);
+    expectPagesToGoTo(*view);
     expectStakeoutPrinted(*report, *view);
 }
 
-TEST(StakeoutAgain, ASavedListThatIsOpenedHasItsPagesOnSheetsAndInThePdf)
+TEST(StakeoutAgain, ASavedListThatIsOpenedHasItsPagesOnSheetsInThePdfAndToGoTo)
 {
     const FixedSurroundings surroundings; // with a printer
     for (const char *name : {"a.rep", "a.rtf"}) {
@@ -63,7 +86,7 @@ TEST(StakeoutAgain, ASavedListThatIsOpenedHasItsPagesOnSheetsAndInThePdf)
     }
 }
 
-TEST(StakeoutAgain, ARecoveredListHasItsPagesOnSheetsAndInThePdf)
+TEST(StakeoutAgain, ARecoveredListHasItsPagesOnSheetsInThePdfAndToGoTo)
 {
     struct Row
     {
