@@ -99,12 +99,13 @@ void DialogAnswers::answerBox(QMessageBox &box)
 void DialogAnswers::answerFile(QFileDialog &dialog)
 {
     const bool saves = dialog.acceptMode() == QFileDialog::AcceptSave;
-    const QString name = file ? file(chance_, saves) : QString();
-    if (name.isEmpty() || chance_.oneIn(5)) {
+    const QString given = std::exchange(nextFile, QString());
+    const QString name = !given.isEmpty() ? given : file ? file(chance_, saves) : QString();
+    if (name.isEmpty() || (given.isEmpty() && chance_.oneIn(5))) {
         dialog.reject();
         return;
     }
-    if (saves && chance_.oneIn(3)) {
+    if (saves && given.isEmpty() && chance_.oneIn(3)) {
         const QStringList kinds = dialog.nameFilters();
         dialog.selectNameFilter(kinds.at(chance_.below(kinds.size())));
     }

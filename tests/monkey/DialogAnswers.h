@@ -37,6 +37,8 @@ public:
     std::vector<Answer> take();
     /// Answers what an open dialog asks for a file to read, or a name to save under.
     std::function<QString(Chance &, bool saves)> file;
+    /// The file that the next dialog for one is answered with, whatever chance says; empty for none.
+    QString nextFile;
     /// Whether each question is to be agreed to, as when reports come back after a crash.
     bool agrees = false;
     /// Windows that could not be closed, by their class and title.

@@ -1,10 +1,12 @@
-#include "World.h"
-
+#include "DeskCommandIds.h"
 #include "DeskFrame.h"
 #include "PageHeader.h"
+#include "Pages.h"
+#include "ReportContent.h"
 #include "ReportTextDecoder.h"
 #include "RichTextReader.h"
 #include "UReportDoc.h"
+#include "World.h"
 
 #include <QFile>
 #include <QFileInfo>
@@ -115,7 +117,7 @@ QString World::checkSaved(const UReportDoc &report, const Seen &was)
     if (isSavedAs && !loadsAs(path, text)) {
         return QStringLiteral("%1 is not what it was saved as, %2").arg(was.title, path) + describeWritten(text);
     }
-    if (path.endsWith(u".rep") && !isRich(report)) {
+    if ((path.endsWith(u".rep") || path.endsWith(u".rtf")) && !isRich(report)) {
         saved_.insert(was.id, {path, lookAtFiles().value(path)});
     }
     return {};
@@ -157,38 +159,57 @@ void World::reopen(Chance &chance)
         return;
     }
     const UReportDoc &report = *all[static_cast<std::size_t>(chance.below(static_cast<qsizetype>(all.size())))];
-    did = report.GetPathName();
+    const bool byCommand = chance.oneIn(2);
+    did = report.GetPathName() + (byCommand ? QStringLiteral(" by the command") : QString());
+    const QString ending = QFileInfo(report.GetPathName()).suffix();
     QString copy;
     for (int number = 1; copy.isEmpty() || QFile::exists(copy); ++number) {
-        copy = files().filePath(QStringLiteral("copy %1.rep").arg(number));
+        copy = files().filePath(QStringLiteral("copy %1.%2").arg(number).arg(ending));
     }
     const qint64 limit = fileLimit();
     limitFiles(-1);
     const bool isCopied = QFile::copy(report.GetPathName(), copy);
     limitFiles(limit);
+    wrong_ = isCopied ? openSaved(report, copy, byCommand) : QStringLiteral("it is not there");
+    if (!wrong_.isEmpty()) {
+        wrong_.prepend(did + QStringLiteral(" opened again: "));
+    }
+}
+
+QString World::openSaved(const UReportDoc &report, const QString &copy, bool byCommand)
+{
     // What it is compared with, as the report may be closed meanwhile.
     const QString text = textOf(report);
     const std::vector<qint64> starts = report.GetPageStarts();
+    // Pages that no header line begins are in no file.
     const bool hasHeaders = !starts.empty() && starts.front() == 0 && kareport::pageHeadersIn(text) == starts;
-    const qsizetype pages = pagesOf(report);
-    if (!isCopied || !frame_->OpenFile(copy)) {
-        wrong_ = QStringLiteral("%1 cannot be opened again").arg(did);
-        return;
+    const std::vector<Page> pages = pagesFor(report);
+    if (byCommand) {
+        answers_.nextFile = copy;
+        frame_->OnCommand(kareport::fileOpenCommand);
+        answers_.nextFile.clear();
+    } else {
+        frame_->OpenFile(copy);
     }
-    for (const UReportDoc *opened : reports()) {
-        if (opened->GetPathName() != copy) {
-            continue;
-        }
-        if (textOf(*opened) != text) {
-            wrong_ = QStringLiteral("%1 opened again is another text").arg(did) + describeWritten(text);
-        } else if (hasHeaders && (opened->GetPageStarts() != starts || pagesOf(*opened) != pages)) {
-            // Pages that no header line begins are in no file.
-            wrong_ =
-                QStringLiteral("%1 opened again has %2 pages and not %3").arg(did).arg(pagesOf(*opened)).arg(pages);
-        }
-        return;
+    const std::vector<UReportDoc *> all = reports();
+    const auto opened =
+        std::find_if(all.begin(), all.end(), [&copy](const UReportDoc *open) { return open->GetPathName() == copy; });
+    if (opened == all.end()) {
+        return QStringLiteral("no report has it");
     }
-    wrong_ = QStringLiteral("%1 was opened again, and no report has it").arg(did);
+    const bool isRichText = copy.endsWith(u".rtf") && isRich(**opened);
+    const QString kept = isRichText ? kareport::shownPlainText(**opened) : textOf(**opened);
+    if (isRichText ? plainLines(kept) != plainLines(text) : kept != text) {
+        return QStringLiteral("another text") + describeWritten(text);
+    }
+    const std::vector<Page> openedPages = pagesFor(**opened);
+    const auto isSame = [](const Page &one, const Page &other) { return one.ink == other.ink; };
+    if (hasHeaders && (!std::equal(pages.begin(), pages.end(), openedPages.begin(), openedPages.end(), isSame) ||
+                       (!isRichText && (*opened)->GetPageStarts() != starts)))
+    {
+        return QStringLiteral("other pages, %1 and not %2").arg(openedPages.size()).arg(pages.size());
+    }
+    return {};
 }
 
 void World::openLong()

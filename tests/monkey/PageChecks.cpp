@@ -1,19 +1,24 @@
-#include "World.h"
+#include "Pages.h"
 
 #include "PageFit.h"
 #include "PdfExport.h"
 #include "PrintGeometry.h"
 #include "ReportContent.h"
+#include "ReportEdit.h"
 #include "ReportPages.h"
 #include "UReportDoc.h"
 #include "UReportView.h"
+#include "World.h"
 
 #include <QBuffer>
+#include <QCryptographicHash>
+#include <QDataStream>
 #include <QFile>
 #include <QPageSize>
 #include <QPainter>
 #include <QPrinter>
 #include <QProcess>
+#include <QTextDocument>
 
 #include <algorithm>
 
@@ -24,37 +29,7 @@ namespace
 {
 
 constexpr double pointsPerInch = 72;
-
-/// What leaves ink, and does in every face: a sheet is compared by it.
-QString inkOf(QStringView text)
-{
-    QString ink;
-    for (const QChar character : text) {
-        const char16_t code = character.unicode();
-        if (code > u' ' && code < u'\x7F' && code != u'?') {
-            ink += character;
-        }
-    }
-    return ink;
-}
-
-/// The first line of a text that leaves ink.
-QString firstInk(const QString &text)
-{
-    for (const QStringView line : QStringView(text).split(u'\n')) {
-        if (const QString ink = inkOf(line); !ink.isEmpty()) {
-            return ink;
-        }
-    }
-    return {};
-}
-
-/// A page of a report, and whether it has room on a sheet in the smallest type.
-struct Page
-{
-    QString firstInk;
-    bool hasRoom = true;
-};
+constexpr int mostSheets = 2000;
 
 /// The part of a sheet that takes text, in points.
 QSizeF roomOf(const UReportDoc &report)
@@ -82,7 +57,20 @@ bool hasRoomFor(const QString &text, const QSizeF &room)
            double(widest) * cellWidth * kareport::smallestType <= room.width();
 }
 
-/// The pages that a report says it has.
+} // namespace
+
+QString inkOf(QStringView text)
+{
+    QString ink;
+    for (const QChar character : text) {
+        const char16_t code = character.unicode();
+        if (code > u' ' && code < u'\x7F' && code != u'?') {
+            ink += character;
+        }
+    }
+    return ink;
+}
+
 std::vector<Page> pagesFor(const UReportDoc &report)
 {
     const QString text = report.HoldsRichTextSource() ? kareport::shownPlainText(report) : report.CopyText();
@@ -90,33 +78,47 @@ std::vector<Page> pagesFor(const UReportDoc &report)
     std::vector<Page> pages;
     for (const kareport::ReportPage &page : report.GetPages()) {
         const QString piece = text.mid(page.begin, page.end - page.begin);
-        pages.push_back({firstInk(piece), hasRoomFor(piece, room)});
+        pages.push_back({inkOf(piece), hasRoomFor(piece, room)});
     }
     return pages;
 }
 
-/// Holds sheets against pages: each page begins a sheet, and takes further ones only where it has no room on it.
+namespace
+{
+
+/// Where two texts part, for whoever reads the log.
+QString partingOf(const QString &one, const QString &other)
+{
+    constexpr int shown = 60;
+    const auto at = std::mismatch(one.begin(), one.end(), other.begin(), other.end()).first - one.begin();
+    return QStringLiteral("of %1 and %2 characters, from %3: '%4', '%5'")
+        .arg(one.size())
+        .arg(other.size())
+        .arg(at)
+        .arg(one.mid(at, shown), other.mid(at, shown));
+}
+
+/// Holds sheets against pages: each page begins a sheet and has all its characters, and takes further sheets only where it
+/// has no room on one.
 /// @return where they part; empty where they do not
 QString difference(const QStringList &sheets, const std::vector<Page> &pages)
 {
     qsizetype sheet = 0;
-    for (std::size_t i = 0; i < pages.size(); ++i, ++sheet) {
-        const QString begins = sheet < sheets.size() ? firstInk(sheets[sheet]) : QStringLiteral("(no sheet)");
-        const bool isSame = begins == pages[i].firstInk || (!pages[i].hasRoom && pages[i].firstInk.startsWith(begins));
-        if (!isSame) {
-            return QStringLiteral("sheet %1 of %2 begins with '%3', page %4 of %5 with '%6'")
-                .arg(sheet + 1)
-                .arg(sheets.size())
-                .arg(begins)
-                .arg(i + 1)
-                .arg(pages.size())
-                .arg(pages[i].firstInk);
-        }
-        const bool isLast = i + 1 == pages.size();
-        while (!pages[i].hasRoom && sheet + 1 < sheets.size() &&
-               (isLast || firstInk(sheets[sheet + 1]) != pages[i + 1].firstInk))
-        {
+    for (std::size_t i = 0; i < pages.size(); ++i) {
+        const qsizetype first = sheet;
+        QString printed = sheet < sheets.size() ? inkOf(sheets[sheet]) : QStringLiteral("(no sheet)");
+        ++sheet;
+        while (!pages[i].hasRoom && printed.size() < pages[i].ink.size() && sheet < sheets.size()) {
+            printed += inkOf(sheets[sheet]);
             ++sheet;
+        }
+        if (printed != pages[i].ink) {
+            return QStringLiteral("sheet %1 of %2 is not page %3 of %4, ")
+                       .arg(first + 1)
+                       .arg(sheets.size())
+                       .arg(i + 1)
+                       .arg(pages.size()) +
+                   partingOf(printed, pages[i].ink);
         }
     }
     return sheet == sheets.size() ? QString()
@@ -152,37 +154,34 @@ QString World::checkPdf(const UReportDoc &report)
     return difference(sheetsOf(pdf.data()), pagesFor(report));
 }
 
-QString World::checkPrint(UReportView &view) const
+QByteArray World::printOf(UReportView &view) const
 {
     const UReportDoc &report = *view.GetDocument();
-    const QSizeF room = roomOf(report);
-    if (!report.IsPageFixed() || report.GetPrintResolution() == 0 || room.width() <= 0 || room.height() <= 0) {
-        return {}; // its lines flow, or the margins leave no room, which a message says
-    }
-    const qint64 limit = fileLimit();
-    limitFiles(-1);
     const QString path = folder_.filePath(QStringLiteral("printed.pdf"));
+    QPrinter printer;
+    printer.setOutputFormat(QPrinter::PdfFormat);
+    printer.setOutputFileName(path);
+    printer.setFullPage(true);
+    printer.setPageSize(QPageSize(QSizeF(report.GetPageSize()) / report.GetPrintResolution(), QPageSize::Inch,
+                                  QString(), QPageSize::ExactMatch));
+    kareport::PrintInfo info;
+    info.printer = &printer;
+    info.preview = true; // nobody is asked
+    if (!view.OnPreparePrinting(info)) {
+        return {};
+    }
     {
-        QPrinter printer;
-        printer.setOutputFormat(QPrinter::PdfFormat);
-        printer.setOutputFileName(path);
-        printer.setFullPage(true);
-        printer.setPageSize(QPageSize(QSizeF(report.GetPageSize()) / report.GetPrintResolution(), QPageSize::Inch,
-                                      QString(), QPageSize::ExactMatch));
-        kareport::PrintInfo info;
-        info.printer = &printer;
-        info.preview = true; // nobody is asked
-        if (!view.OnPreparePrinting(info)) {
-            limitFiles(limit);
-            return QStringLiteral("cannot be printed");
-        }
         QPainter painter(&printer);
         view.OnBeginPrinting(painter, info);
-        for (info.curPage = 1; info.curPage <= info.maxPage; ++info.curPage) {
+        for (info.curPage = 1; info.curPage <= mostSheets; ++info.curPage) {
+            // A page that is found is printed, also after the last that was counted, as where lines take several rows.
+            view.OnPrepareDC(painter, info);
+            if (view.GetPageStarts().size() < static_cast<std::size_t>(info.curPage)) {
+                break;
+            }
             if (info.curPage > 1) {
                 printer.newPage();
             }
-            view.OnPrepareDC(painter, info);
             view.OnPrint(painter, info);
         }
         view.OnEndPrinting(painter, info);
@@ -190,31 +189,79 @@ QString World::checkPrint(UReportView &view) const
     QFile file(path);
     const QByteArray pdf = file.open(QIODevice::ReadOnly) ? file.readAll() : QByteArray();
     file.remove();
-    limitFiles(limit);
-    return difference(sheetsOf(pdf), pagesFor(report));
+    return pdf;
 }
 
-QString World::checkPages() const
+QString World::checkPrint(UReportView &view) const
 {
-    constexpr int interval = 7; // steps: a PDF takes its time
-    if (steps_ % interval != 0) {
-        return {};
+    const UReportDoc &report = *view.GetDocument();
+    const QSizeF room = roomOf(report);
+    if (report.GetPrintResolution() == 0 || room.width() <= 0 || room.height() <= 0) {
+        return {}; // the margins leave no room, which a message says
     }
+    const qint64 limit = fileLimit();
+    limitFiles(-1);
+    const QByteArray pdf = printOf(view);
+    limitFiles(limit);
+    if (pdf.isEmpty()) {
+        return QStringLiteral("cannot be printed");
+    }
+    const QStringList sheets = sheetsOf(pdf);
+    if (report.IsPageFixed() && !isRich(report)) {
+        return difference(sheets, pagesFor(report));
+    }
+    // Its lines flow from sheet to sheet.
+    const QString printed = inkOf(sheets.join(QString()));
+    const QString shown = inkOf(view.GetEdit().document()->toPlainText());
+    return printed == shown ? QString() : QStringLiteral("the sheets have another text, ") + partingOf(printed, shown);
+}
+
+QByteArray World::makingOf(const UReportDoc &report)
+{
+    QByteArray making;
+    QDataStream stream(&making, QIODevice::WriteOnly);
+    const QString text = report.CopyText();
+    QCryptographicHash hash(QCryptographicHash::Sha1);
+    hash.addData(QByteArrayView(reinterpret_cast<const char *>(text.utf16()), text.size() * 2));
+    stream << hash.result() << report.GetPageSize() << report.GetPrintResolution() << report.GetMargins()
+           << report.IsPageFixed() << report.GetLinesPerPage() << report.GetCharsPerRow() << report.GetFontName()
+           << report.GetFontSize() << report.HasLostText() << report.IsOpenedFromRtf() << report.GetRTFDataFlag()
+           << report.GetLineCount();
+    for (const qint64 start : report.GetPageStarts()) {
+        stream << start;
+    }
+    return making;
+}
+
+bool World::isNew(const QByteArray &making)
+{
+    const std::size_t before = lookedAt_.size();
+    lookedAt_.insert(making);
+    return lookedAt_.size() > before;
+}
+
+QString World::checkPages()
+{
+    constexpr quint64 interval = 56; // steps: a long one takes its time, and printing would end its loading
     const auto isLookedAt = [this](const UReportDoc &report) {
         constexpr qint64 longText = 200'000;
-        return !report.IsEmpty() && (report.GetTextLength() < longText || steps_ % (8 * interval) == 0);
+        return !report.IsEmpty() && (report.GetTextLength() < longText || steps_ % interval == 0);
     };
     for (const UReportDoc *report : reports()) {
-        if (isLookedAt(*report)) {
+        if (isLookedAt(*report) && isNew("PDF" + makingOf(*report))) {
             if (const QString wrong = checkPdf(*report); !wrong.isEmpty()) {
                 return QStringLiteral("the PDF of \"%1\": ").arg(report->GetTitle()) + wrong;
             }
         }
     }
     for (UReportView *view : viewsOnScreen()) {
-        if (isLookedAt(*view->GetDocument()) && !isRich(*view->GetDocument())) {
+        const UReportDoc &report = *view->GetDocument();
+        // Formats are the view's own.
+        const bool hasFormats = view->ShowsFormats() || isRich(report);
+        const QByteArray formats = hasFormats ? view->GetEdit().document()->toHtml().toUtf8() : QByteArray();
+        if (isLookedAt(report) && isNew("print" + makingOf(report) + formats)) {
             if (const QString wrong = checkPrint(*view); !wrong.isEmpty()) {
-                return QStringLiteral("\"%1\" printed: ").arg(view->GetDocument()->GetTitle()) + wrong;
+                return QStringLiteral("\"%1\" printed: ").arg(report.GetTitle()) + wrong;
             }
         }
     }

@@ -41,12 +41,16 @@ void putFile(const QString &path, const QByteArray &content)
     }
 }
 
+/// Lets all follow that follows at once. One thing brings another, and each may wait for a turn of its own.
 void settle()
 {
-    QCoreApplication::sendPostedEvents();
-    QCoreApplication::processEvents();
-    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
-    QCoreApplication::processEvents();
+    constexpr int turns = 3;
+    for (int turn = 0; turn < turns; ++turn) {
+        QCoreApplication::sendPostedEvents();
+        QCoreApplication::processEvents();
+        QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+        QCoreApplication::processEvents();
+    }
 }
 
 } // namespace

@@ -82,7 +82,8 @@ public:
     QString checkRecovered();
     QString newPath(Chance &chance) const;
 
-    /// Opens what a report was saved in, as a user does with a copy of the file. What is wrong with it is found by the check.
+    /// Opens what a report was saved in, as a user does with a copy of the file, by the command for it or otherwise. What
+    /// is wrong with it is found by the check.
     void reopen(Chance &chance);
     /// Opens a report so long that it is loaded in pieces.
     void openLong();
@@ -120,7 +121,15 @@ private:
     QString checkSaved(const UReportDoc &report, const Seen &was);
     /// The reports that stand in their files as they are now.
     std::vector<UReportDoc *> savedReports() const;
+    /// Opens a file that a report was saved in, or a copy of it. @return what is wrong with what is opened; empty when nothing is
+    QString openSaved(const UReportDoc &report, const QString &copy, bool byCommand);
     static QString checkPdf(const UReportDoc &report);
+    /// All that the PDF and the print of a report are made of.
+    static QByteArray makingOf(const UReportDoc &report);
+    /// Whether that was not looked at yet: what is made of the same is the same.
+    bool isNew(const QByteArray &making);
+    /// What a view prints into a file; empty where it refuses to.
+    QByteArray printOf(UReportView &view) const;
     QString checkPrint(UReportView &view) const;
 
     QString checkClosed() const;
@@ -128,7 +137,7 @@ private:
     QString checkFiles();
     QString checkWindows();
     QString checkActive() const;
-    QString checkPages() const;
+    QString checkPages();
     /// How the panes stand, for whoever reads the log.
     QString describePanes() const;
 
@@ -144,6 +153,7 @@ private:
     QHash<quint64, Saved> saved_; ///< by the numbers of reports
     QString wrong_;               ///< what the step itself has found
     std::vector<Answer> given_;
+    std::set<QByteArray> lookedAt_;
     quint64 steps_ = 0;
     bool mayBeInTabs_ = false; ///< the keyboard, which the Tab key leads to the rows of tabs
 };
