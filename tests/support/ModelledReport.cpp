@@ -1,9 +1,11 @@
 #include "ModelledReport.h"
 
-#include "LoadedText.h"
-#include "RichTextReader.h"
-
 #include <QTextBlock>
+
+QString ModelledReport::inkOf(QString text)
+{
+    return text.remove(u'\r').remove(u'\n').remove(u' ');
+}
 
 ModelledReport::ModelledReport(QString &clipboard)
     : template_(shown_.report), model_(headerOf(QStringLiteral("Title"), 0).chopped(3)), clip_(clipboard)
@@ -191,6 +193,8 @@ void ModelledReport::actAsHost(const ReportStep &step)
     case ReportOp::Load: load(step); break;
     case ReportOp::SaveAlone: saveAlone(); return;
     case ReportOp::SaveRichText: saveRichText(); return;
+    case ReportOp::Open: openSaved(); break;
+    case ReportOp::ReloadRichText: reloadRichText(); break;
     case ReportOp::OpenView:
         if (views_.size() < 3) {
             openView(step.b % 2 == 0);
@@ -298,104 +302,11 @@ QString ModelledReport::longText(int seed)
     return text;
 }
 
-void ModelledReport::reload()
-{
-    const QString path = folder_.filePath(QStringLiteral("a.rep"));
-    const QString text = model_.text();
-    if (report().IsEmpty() || (text.contains(u'\n') && !text.contains(QStringLiteral("\r\n")))) {
-        return; // with no line end of a report in it, such a file reads as that of an editor
-    }
-    report().SetPathName(path, false);
-    wrongAnswer_ = wrongAnswer_ || !report().OnSaveDocument(path) || report().IsModified() ||
-                   !kareport::reloadSavedReport(report());
-    isRich_ = false;
-    model_.reload(text);
-    model_.setLinesPerPage(report().GetLinesPerPage());
-    isModified_ = false;
-}
-
 bool ModelledReport::isAllCrLf() const
 {
     const QString text = model_.text();
     return text.count(u'\n') == text.count(QStringLiteral("\r\n")) &&
            text.count(u'\r') == text.count(QStringLiteral("\r\n"));
-}
-
-void ModelledReport::load(const ReportStep &step)
-{
-    static const QStringList lines = {QStringLiteral("loaded"), QString(), QStringLiteral("1.5  x"),
-                                      headerOf(QStringLiteral("Loaded"), 3)};
-    const bool keepsEnds = step.a % 2 == 0;
-    QStringList chosen;
-    for (int i = 0; i <= step.b % 25; ++i) {
-        chosen.append(lines[(step.c / (i + 1) + i) % lines.size()]);
-    }
-    const QString path = folder_.filePath(QStringLiteral("loaded.rep"));
-    putFile(path, chosen.join(QStringLiteral("\r\n")).toLatin1() + "\r\n");
-    wrongAnswer_ = wrongAnswer_ || report().LoadFile(path, keepsEnds) != 1;
-    model_.load(chosen, keepsEnds);
-    isModified_ = true;
-}
-
-void ModelledReport::saveAlone()
-{
-    const QString path = folder_.filePath(QStringLiteral("alone.rep"));
-    const QString text = model_.text();
-    wrongAnswer_ = wrongAnswer_ || !report().OnSaveDocument(path);
-    isModified_ = false;
-    if (text.isEmpty() || (text.contains(u'\n') && !text.contains(QStringLiteral("\r\n")))) {
-        return; // there is no file, or one that reads as that of an editor
-    }
-    QFile file(path);
-    kareport::LoadedText saved;
-    const bool isRead = file.open(QIODevice::ReadOnly) &&
-                        kareport::loadReportText(file.readAll(), saved) == kareport::TextLoading::Whole;
-    if (!isRead || saved.text.piece(0, saved.text.size()) != text || saved.pageStarts != ReportModel::headersIn(text)) {
-        wrongSave_ = QStringLiteral("saved alone: ") + brief(saved.text.piece(0, saved.text.size()));
-    }
-}
-
-namespace
-{
-
-/// A text without its line ends and blanks: an image of it has fewer of the first, and more of the others.
-QString inkOf(QString text)
-{
-    return text.remove(u'\r').remove(u'\n').remove(u' ');
-}
-
-/// The lines of a text, without the empty ones at its end.
-QString linesOf(QString text)
-{
-    text.replace(QStringLiteral("\r\n"), QStringLiteral("\n"));
-    while (text.endsWith(u'\n')) {
-        text.chop(1);
-    }
-    return text;
-}
-
-} // namespace
-
-void ModelledReport::saveRichText()
-{
-    constexpr qint64 longestSaved = 100'000; // characters
-    if (model_.size() == 0 || model_.size() > longestSaved) {
-        return;
-    }
-    const QString path = folder_.filePath(QStringLiteral("alone.rtf"));
-    wrongAnswer_ = wrongAnswer_ || !report().OnSaveDocument(path);
-    for (Shown &shown : views_) { // which were updated for it
-        shown.isStale = false;
-        shown.isEdited = false;
-    }
-    QFile file(path);
-    QTextDocument saved;
-    const bool isRead =
-        file.open(QIODevice::ReadOnly) && !kareport::readRichText(QByteArrayView(file.readAll()), saved);
-    const QString lines = linesOf(saved.toPlainText());
-    if (!isRead || (isRich_ ? inkOf(lines) != inkOf(image_) : lines != linesOf(model_.text()))) {
-        wrongSave_ = QStringLiteral("saved as rich text: ") + brief(lines);
-    }
 }
 
 void ModelledReport::switchOn()

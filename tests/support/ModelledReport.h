@@ -24,6 +24,9 @@ public:
     /// @return what is wrong with it, as after a step with another report; empty when nothing is
     QString compare();
 
+    /// A text without its line ends and blanks: an image of it has fewer of the first, and more of the others.
+    static QString inkOf(QString text);
+
 private:
     UReportDoc &report() { return shown_.report; }
 
@@ -69,6 +72,13 @@ private:
     /// Saves that change nothing, but that the report is then as its file.
     void saveAlone();
     void saveRichText();
+
+    /// A host opens the file that the report was saved in, which comes after what the report holds.
+    void openSaved();
+    /// Saves as rich text, loads that in the place of the report, looks at its pages, and brings the report's text back.
+    void reloadRichText();
+    /// @return what is wrong with rich text that was loaded in the place of a text; empty when nothing is
+    QString wrongWithRichText(const QString &before, const QStringList &pagesBefore);
 
     bool isAllCrLf() const;
 

@@ -140,11 +140,11 @@ void ReportModel::skipLines(int count)
     }
 }
 
-void ReportModel::load(const QStringList &lines, bool keepsEnds)
+void ReportModel::load(const QStringList &lines)
 {
     const qint64 before = size();
     for (const QString &line : lines) {
-        writeLine(keepsEnds ? line + u'\n' : line, 0, 1);
+        writeLine(line, 0, 1);
         ++lineCount_;
     }
     if (before == size() || headersIn(text().mid(before)).empty()) {

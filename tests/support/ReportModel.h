@@ -33,6 +33,7 @@ public:
     void setData(const QString &text);
     void setHeading(const QString &text, int before, int after);
     void setHeaderFlag(bool on) { headerFlag_ = on; }
+    bool headerFlag() const { return headerFlag_; }
     void setLinesPerPage(int lines) { linesPerPage_ = lines; }
     int linesPerPage() const { return linesPerPage_; }
     int lineCount() const { return lineCount_; }
@@ -45,10 +46,12 @@ public:
     void writeLine(const QString &text, int before, int after);
     void writeTable(const ModelTable &table);
     void writeBlock(const QStringList &lines, int before, int after);
-    /// A file has been read at the end of the report. @param keepsEnds  whether its lines keep their own line ends
-    void load(const QStringList &lines, bool keepsEnds);
+    /// A file has been read at the end of the report. @param lines  with the line ends that they keep
+    void load(const QStringList &lines);
     /// The report has been read back from its file.
     void reload(const QString &text);
+    /// Lines were counted that are no longer in the text.
+    void countLines(int lines) { lineNumber_ += lines; }
     /// The view has put the same text with other line ends instead of this one.
     void withCrLf();
 

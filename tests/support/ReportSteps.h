@@ -27,6 +27,8 @@ enum class ReportOp
     Load,
     SaveAlone,
     SaveRichText,
+    Open,
+    ReloadRichText,
     // of users, in view `a`
     Type,
     LineEnd,
@@ -55,11 +57,12 @@ enum class ReportOp
 };
 
 inline constexpr const char *reportOpNames[] = {
-    "WriteLine",  "Write",        "LineFeed",    "NewPage", "Rows",      "Table",      "Block",       "Heading",
-    "HeaderFlag", "LinesPerPage", "SetData",     "Clear",   "RichText",  "RichTextOn", "RichTextOff", "Load",
-    "SaveAlone",  "SaveRichText", "Type",        "LineEnd", "Backspace", "Delete",     "Cut",         "Paste",
-    "TypeOver",   "Undo",         "Redo",        "TakeAll", "OpenView",  "CloseView",  "Reload",      "HidePane",
-    "ShowPane",   "WriteUnseen",  "SetLongData", "GoOn",    "NeedAll",   "OpenReport", "CloseReport"};
+    "WriteLine",   "Write",       "LineFeed",     "NewPage",      "Rows",       "Table",          "Block",
+    "Heading",     "HeaderFlag",  "LinesPerPage", "SetData",      "Clear",      "RichText",       "RichTextOn",
+    "RichTextOff", "Load",        "SaveAlone",    "SaveRichText", "Open",       "ReloadRichText", "Type",
+    "LineEnd",     "Backspace",   "Delete",       "Cut",          "Paste",      "TypeOver",       "Undo",
+    "Redo",        "TakeAll",     "OpenView",     "CloseView",    "Reload",     "HidePane",       "ShowPane",
+    "WriteUnseen", "SetLongData", "GoOn",         "NeedAll",      "OpenReport", "CloseReport"};
 static_assert(std::size(reportOpNames) == std::size_t(ReportOp::count));
 
 /// What the numbers mean is brought into what there is, so that every step makes sense in every state.
