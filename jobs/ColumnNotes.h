@@ -45,7 +45,7 @@ bool isRead(const SourceColumns &columns, const QString &variable);
 /// Notes on the columns that are no variable of a dictionary. Of very many, the last note says how many more there are.
 std::vector<JobNote> unknownColumns(const SourceColumns &columns, const sXmlReportDictionary &dictionary);
 
-/// The keys of the units that numbers of the data are taken to be in, as nobody has said them.
+/// The keys of the units that numbers of the data are taken to be in, as the job does not say them.
 QStringList assumedUnits(const SourceColumns &columns, const sXmlReportDictionary &dictionary, const DataUnits &units);
 
 /// The fields of a table or block whose variable is read from no column, or is not in the dictionary, each variable once.

@@ -21,9 +21,9 @@ public:
     /// @param path  "-" for standard input
     Expected<std::shared_ptr<const FileBytes>> open(const QString &path);
 
-    /// The SQLite database of a path; empty as long as nobody has opened it.
+    /// The SQLite database of a path; empty until it is opened.
     std::shared_ptr<SqliteFile> &database(const QString &path) { return databases_[path]; }
-    /// The connection to a PostgreSQL database; empty as long as nobody has made it.
+    /// The connection to a PostgreSQL database; empty until it is made.
     std::shared_ptr<PostgresConnection> &connection(const QString &name) { return connections_[name]; }
 
 private:

@@ -74,7 +74,7 @@ struct DataKind
     QString key;
     /// The other keys that a data set of the kind may have, without "units", which all have.
     QStringList options;
-    /// Reads a data set of the kind. What is wrong with it fails the node, and then nobody uses what comes back.
+    /// Reads a data set of the kind. What is wrong with it fails the node, and then what comes back is not used.
     /// @param folder  names of files are relative to it
     std::function<std::shared_ptr<const DataSource>(const JsonNode &set, const QDir &folder)> read;
 };

@@ -22,7 +22,7 @@ struct JobSlice
     QStringList of(const QStringList &jobs) const;
 };
 
-/// Reads the names of job files, one a line; blank lines are passed over. Where the list holds a 0 byte, the names are
+/// Reads the names of job files, one a line; blank lines are skipped. Where the list holds a 0 byte, the names are
 /// separated by these instead; line ends are then part of the names, and the last name must end with a 0 byte as well, so
 /// that a 0 byte that got into a line is told from that. Names are relative to the current folder, wherever the list is.
 /// @param path  "-" for standard input

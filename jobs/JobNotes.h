@@ -12,13 +12,13 @@
 namespace kareport
 {
 
-/// What somebody should know of a report that is made all the same: something of the data or the template that does not
+/// What the user should know of a report that is made all the same: something of the data or the template that does not
 /// come together.
 struct JobNote
 {
     enum class Kind
     {
-        UnknownColumn, ///< a column that is no variable, so that nobody reads it
+        UnknownColumn, ///< a column that is no variable, so that it is not read
         UnfilledField, ///< a field whose variable is in no column or no dictionary, so that it shows nothing or zero
         WideValue,     ///< values wider than their column
         MissingValue,  ///< values that are not there and show as 0
@@ -27,7 +27,7 @@ struct JobNote
         UnknownSortKey, ///< a sort key of a table that is in no dictionary, so that the rows are sorted by another one
         Difference,     ///< what does not fit together in the data itself
         PassedOver,     ///< what a data file holds and no list reads: said, but no mistake of anybody
-        AssumedUnit ///< a unit of the data that nobody has said: for the file of notes alone, no reason to say anything
+        AssumedUnit ///< a unit of the data that the job does not say: for the file of notes alone, no reason to say anything
     };
     Kind kind;
     InputError about;     ///< the place and the text
@@ -35,7 +35,7 @@ struct JobNote
     quint64 values = 0;   ///< how many values are meant; 0 for none
     quint64 firstRow = 0; ///< of the data as it is printed, from 1; 0 for none
 
-    /// Whether somebody has to look at it.
+    /// Whether the user has to look at it.
     bool isToBeSaid() const { return kind != Kind::AssumedUnit && kind != Kind::BlankValue; }
     /// Whether it is an error in a strict job.
     bool isMistake() const { return isToBeSaid() && kind != Kind::PassedOver; }

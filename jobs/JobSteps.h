@@ -30,7 +30,7 @@ class JobSteps
 {
 public:
     /// @param source     the job file, for the places of errors
-    /// @param notes      receive what somebody should know of the report
+    /// @param notes      receive what the user should know of the report
     /// @param isStopped  is asked after each step
     JobSteps(const Job &job, const JsonSource &source, JobData &data, UReportDoc &report, StepNotes notes,
              const std::function<bool()> &isStopped)

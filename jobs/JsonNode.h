@@ -11,7 +11,7 @@
 namespace kareport
 {
 
-/// A value of a JSON file with the way to it. Reading one in another type than it has is an error, which is kept for whoever
+/// A value of a JSON file with the way to it. Reading one in another type than it has is an error, which is kept for the code that
 /// reads the whole; what comes back then is the fallback.
 class JsonNode
 {

@@ -99,7 +99,7 @@ void JsonObjectList::noteMember(const JsonSource &source, const JsonNode &member
     if (parser != nullptr) {
         columns_.variables.append(foldedKey(name));
     }
-    // Finding a place reads the job from its beginning: it is done for as many as somebody may read.
+    // Finding a place reads the job from its beginning: it is done for as many as a person may read.
     constexpr qsizetype mostPlaces = 100;
     const bool needsPlace = parser == nullptr && names_.size() <= mostPlaces;
     const auto place = needsPlace ? source.errorAt(member.path(), QString(), true).place : std::nullopt;

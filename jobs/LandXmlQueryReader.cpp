@@ -117,7 +117,7 @@ double stationOf(const JsonNode &node)
     return station;
 }
 
-/// A line beside the alignment: its offset alone, or an object of offset and crossfall.
+/// A line parallel to the alignment: its offset alone, or an object of offset and crossfall.
 LandXmlOffset offsetOf(const JsonNode &node)
 {
     constexpr double mostCrossfall = 1000;

@@ -81,7 +81,7 @@ std::optional<ColumnFault> ColumnBinding::bind(std::vector<SourceColumn> &column
     if (auto fault = bindNames(columns, choices, variables)) {
         return fault;
     }
-    // Cells are looked at in the order that they stand in, so that the first one that is wrong is said.
+    // Cells are looked at in their order, so that the first wrong one is reported.
     std::stable_sort(fields_.begin(), fields_.end(),
                      [](const BoundField &left, const BoundField &right) { return left.column < right.column; });
     noteIds();

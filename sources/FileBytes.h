@@ -32,10 +32,10 @@ public:
 
     std::string_view view() const { return view_; }
     const QString &path() const { return path_; }
-    /// Says that what stands before a byte is not read again soon.
+    /// Says that what comes before a byte is not read again soon.
     void release(std::size_t end) const { mapped_.release(end); }
-    /// Gives the memory of what was read back to the system, a large piece at a time, for whoever reads on from there.
-    /// @param end       what stands before it is not read again soon
+    /// Gives the memory of what was read back to the system, a large piece at a time, for a reader that goes on from there.
+    /// @param end       what comes before it is not read again soon
     /// @param released  up to where memory was given back; it is moved on
     void releaseBefore(std::size_t end, std::size_t &released) const
     {

@@ -7,7 +7,7 @@
 namespace kareport
 {
 
-/// A file's bytes, mapped into memory. Where somebody cuts the file short while it is read, or the disk fails, its lost
+/// A file's bytes, mapped into memory. Where the file is cut short while it is read, or the disk fails, its lost
 /// part reads as zeros, and `isLost` says so: that must be asked before what was read is believed.
 class MappedFile
 {
@@ -21,10 +21,10 @@ public:
     bool map(int handle, std::size_t size);
     std::string_view view() const { return {begin_, size_}; }
     bool isLost() const;
-    /// Gives the memory of what stands before a byte back to the system: a large file that is read in one pass is then
+    /// Gives the memory of the bytes before one back to the system: a large file that is read in one pass is then
     /// never in memory as a whole. What is read there again comes from the file again.
     void release(std::size_t end) const;
-    /// The same for what stands between two bytes, from the page of the first one to the one before the page of the second.
+    /// The same for the bytes between two, from the page of the first one to the one before the page of the second.
     void release(std::size_t begin, std::size_t end) const;
 
 private:

@@ -47,7 +47,7 @@ extern "C" void readLostPage(int signal, siginfo_t *info, void *context)
             return;
         }
     }
-    // It is none of ours: whoever handled it before does, or the process ends by it when the access is tried again.
+    // It is none of ours: the handler before this one takes it, or the process ends by it when the access is tried again.
     if ((static_cast<unsigned>(otherHandler.sa_flags) & SA_SIGINFO) != 0) {
         otherHandler.sa_sigaction(signal, info, context);
     } else {

@@ -18,7 +18,7 @@ struct PointGeometry
     qint32 referenceSystem = 0; ///< its number; 0 where none is said
 };
 
-/// A point, or what stands there in its place, for a message that says that a point was expected.
+/// A point, or what is there instead, for a message that says that a point was expected.
 using PointOrFault = std::variant<PointGeometry, QString>;
 
 /// Reads a geometry in well-known binary: of ISO with dimensions in its type (1, 1001, 2001, 3001), or extended with flags

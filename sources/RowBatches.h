@@ -36,15 +36,15 @@ struct RowBatch
     }
 };
 
-/// Reads batches of rows ahead of whoever uses them: while one batch is used, the next is read on another thread. The
-/// first one is read by whoever asks for it: a file of a few rows needs no thread. Where a row may be long in coming, all
-/// are read on the other thread, and whoever asks looks now and then whether work is to stop.
+/// Reads batches of rows ahead of their use: while one batch is used, the next is read on another thread. The
+/// first one is read by the thread that asks for it: a file of a few rows needs no thread. Where a row may be long in coming, all
+/// are read on the other thread, and the asking thread looks now and then whether work is to stop.
 class RowBatches
 {
 public:
     /// @param fill  reads the next rows into a batch. It is called on a thread of its own but for the first batch, never
     ///              twice at a time, and not any more after the last batch
-    /// @param poll  when there is one, it is called a few times a second while a batch is waited for, by whoever waits; all
+    /// @param poll  when there is one, it is called a few times a second while a batch is waited for, by the thread that waits; all
     ///              batches are then read on the other thread
     explicit RowBatches(std::function<void(RowBatch &)> fill, std::function<void()> poll = nullptr);
     ~RowBatches();

@@ -18,7 +18,7 @@ namespace kareport
 /// Is told now and then how far reading has come, in the unit that the source counts in. @return false to stop
 using ReadProgress = std::function<bool(std::size_t done)>;
 
-/// The columns of a data source, for whoever says which of them nobody reads.
+/// The columns of a data source, for code that says which of them are not read.
 struct SourceColumns
 {
     QString source; ///< what messages call the source: its file, or a connection

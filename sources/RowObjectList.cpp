@@ -12,7 +12,7 @@ namespace kareport
 namespace
 {
 
-/// Ends a sorting that nobody waits for any more.
+/// Ends a sorting that was stopped.
 struct Stopped
 {};
 

@@ -11,7 +11,7 @@
 namespace kareport
 {
 
-/// Where a row stands in what it is read from.
+/// Where a row is in what it is read from.
 struct RowPlace
 {
     std::size_t start = 0;
@@ -36,7 +36,7 @@ public:
     virtual void rewind() = 0;
     const std::optional<InputError> &error() const { return error_; }
 
-    /// Where reading has come to, for whoever shows progress: bytes of a file, rows of a database.
+    /// Where reading has come to, for showing progress: bytes of a file, rows of a database.
     virtual std::size_t position() const = 0;
     /// How many bytes the last row took.
     virtual std::size_t rowBytes() const = 0;
@@ -49,7 +49,7 @@ public:
     virtual RowPlace place() const { return {}; }
     virtual void seek(const RowPlace & /*place*/) {}
 
-    /// Whether the next row may be long in coming, so that somebody has to look meanwhile whether work is to stop.
+    /// Whether the next row may be long in coming, so that waiting for it must end when work is to stop.
     virtual bool mayWait() const { return false; }
     /// Ends a wait for the next row, from any thread: no row follows then.
     virtual void stop() {}

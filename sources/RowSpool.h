@@ -23,8 +23,8 @@ public:
     bool add(const UDataObject &object);
     /// Ends the adding, before the first row is read. @return whether all rows are kept
     bool finish() { return bytes_.finish(); }
-    /// Reads the row at a place into an object, which may hold the values of an earlier row. The first row stands at 0.
-    /// @return where the row after it stands
+    /// Reads the row at a place into an object, which may hold the values of an earlier row. The first row is at 0.
+    /// @return where the row after it is
     std::size_t read(std::size_t place, UDataObject &object) const;
     /// Where the last row ends.
     std::size_t end() const { return bytes_.size(); }

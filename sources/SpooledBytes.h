@@ -13,7 +13,7 @@
 namespace kareport
 {
 
-/// Bytes that are made one after the other and then read: few are held, many stand in a temporary file without a name, so
+/// Bytes that are made one after the other and then read: few are held, many are kept in a temporary file without a name, so
 /// that memory does not grow with them.
 class SpooledBytes
 {
@@ -35,7 +35,7 @@ public:
     bool finish();
     /// All bytes, after `finish`.
     std::string_view view() const { return view_; }
-    /// Gives the memory of what stands between two bytes back to the system. What is read there again comes from the
+    /// Gives the memory of the bytes between two positions back to the system. What is read there again comes from the
     /// temporary file.
     void release(std::size_t begin, std::size_t end) const;
     /// What is wrong with the temporary file.

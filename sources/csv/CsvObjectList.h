@@ -14,7 +14,7 @@ class CsvObjectList : public RowObjectList
 {
 public:
     /// Reads the header row of a file that follows RFC 4180 but for its delimiter. Columns that the dictionary does not know
-    /// are passed over.
+    /// are skipped.
     CsvObjectList(std::shared_ptr<const FileBytes> file, char delimiter, const FindVariable &findVariable,
                   ReadProgress progress);
     /// Reads what comes before the rows of a file of any dialect.

@@ -16,7 +16,7 @@ enum ByteClass : unsigned char
 {
     ordinary = 0,
     high,   ///< part of a character outside ASCII
-    special ///< ends a cell or stands nowhere in a plain one
+    special ///< ends a cell or is wrong in a plain one
 };
 
 constexpr std::string_view byteOrderMark = "\xEF\xBB\xBF";
@@ -174,7 +174,7 @@ bool CsvReader::scanSpacedRow()
     return at - rowStart_ > longestRow ? failTooLong() : endRow(at);
 }
 
-/// Says what is wrong with a character that stands nowhere in a plain cell.
+/// Says what is wrong with a character that a plain cell cannot have.
 bool CsvReader::failInCell(std::size_t at)
 {
     return fail(at, bytes_[at] == '"'

@@ -16,7 +16,7 @@ namespace kareport
 {
 
 /// Reads a CSV text (RFC 4180, UTF-8 with or without a byte-order mark) row by row, in one pass. With other delimiters, and
-/// lines that are passed over, it reads any text of rows and cells.
+/// lines that are skipped, it reads any text of rows and cells.
 class CsvReader
 {
 public:
@@ -25,9 +25,9 @@ public:
     {
         char delimiter = ',';    ///< one ASCII character
         bool whitespace = false; ///< blanks and tabs, as many as there are, delimit; those around a row do not count
-        qsizetype skip = 0;      ///< lines that are passed over at the beginning, whatever they hold
-        std::optional<char> comment;   ///< a line that begins with this ASCII character is passed over
-        bool passesBlankLines = false; ///< lines of nothing, or of blanks and tabs alone, are passed over
+        qsizetype skip = 0;      ///< lines that are skipped at the beginning, whatever they hold
+        std::optional<char> comment;   ///< a line that begins with this ASCII character is skipped
+        bool passesBlankLines = false; ///< lines of nothing, or of blanks and tabs alone, are skipped
     };
 
     /// Longer rows are taken for something that is no CSV.

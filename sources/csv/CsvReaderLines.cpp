@@ -2,7 +2,7 @@
 
 #include <algorithm>
 
-// What a reader does with lines: those that are passed over, and the places of what stands in them.
+// What a reader does with lines: those that are skipped, and places in them.
 
 namespace kareport
 {

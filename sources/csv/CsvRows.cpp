@@ -20,7 +20,7 @@ QString quoteOf(std::string_view cell)
     return text.size() > qsizetype(longestQuote) ? text.left(longestQuote) + u'…' : text;
 }
 
-/// Blanks of any kind, and marks that nobody sees: programs leave them around the names of columns.
+/// Blanks of any kind, and marks that cannot be seen: programs leave them around the names of columns.
 bool isUnseen(QChar character)
 {
     constexpr char16_t byteOrderMark = 0xFEFF;

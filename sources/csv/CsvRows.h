@@ -15,7 +15,7 @@ class CsvRows : public RowReader
 public:
     /// Reads what comes before the rows.
     CsvRows(std::shared_ptr<const FileBytes> file, const CsvDialect &dialect, const Variables &variables);
-    /// Fails where the header row would be passed over although it is data: the first point would be lost.
+    /// Fails where the header row would be skipped although it is data: the first point would be lost.
     void checkHeader();
 
     bool next(UDataObject &object, const std::vector<unsigned> *onlyIds) override;

@@ -40,8 +40,8 @@ private:
     enum class Before
     {
         First,  ///< nothing was read yet
-        Object, ///< an object must stand here
-        Rest    ///< what stands after an object
+        Object, ///< an object must follow
+        Rest    ///< what follows an object
     };
 
     bool findObject();

@@ -20,7 +20,7 @@ namespace kareport
 class JsonKeys
 {
 public:
-    /// Keys that nobody reads are kept to this number: objects may have a key of their own each.
+    /// Keys that are not read are kept up to this number: objects may have a key of their own each.
     static constexpr std::size_t most = 10000;
 
     /// A variable that is read from a key.

@@ -48,7 +48,7 @@ QString reasonOf(const char *text)
     return dash < 0 ? reason : reason.mid(dash + 3);
 }
 
-/// Passes on what stands in the object itself, and passes over what is inside its values.
+/// Passes on what the object itself has, and skips what is inside its values.
 class Events
 {
 public:

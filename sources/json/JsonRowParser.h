@@ -22,7 +22,7 @@ public:
     virtual bool onInteger(qint64 value) = 0;
     virtual bool onNumber(double value) = 0;
     virtual bool onText(std::string_view text) = 0;
-    /// A list or an object, which is passed over.
+    /// A list or an object, which is skipped.
     virtual bool onNested() = 0;
     /// What is wrong with the text, and where.
     virtual void onMistake(const QString &text, std::size_t at) = 0;

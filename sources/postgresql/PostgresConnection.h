@@ -42,7 +42,7 @@ public:
     bool send(const std::vector<std::optional<QByteArray>> &parameters);
     /// The next row, or the end of the rows; null when something went wrong, or when it is to stop.
     PostgresResult next();
-    /// Takes the rest of the rows, which nobody wants, so that something else can be asked.
+    /// Takes the rest of the rows, which are not needed, so that something else can be asked.
     void drain();
 
     /// What went wrong with the last answer.
@@ -67,7 +67,7 @@ private:
     QString name_;
     PGconn *connection_ = nullptr;
     std::optional<InputError> error_;
-    const std::function<bool()> *isToStop_ = nullptr; ///< null where nobody is asked
+    const std::function<bool()> *isToStop_ = nullptr; ///< null where there is nothing to ask
     std::atomic<bool> isStopped_ = false;
     bool isRunning_ = false;   ///< rows may still come
     bool isCancelled_ = false; ///< a query was ended, and the transaction with it

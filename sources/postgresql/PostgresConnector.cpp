@@ -23,13 +23,13 @@ constexpr int waitMilliseconds = 50;
 constexpr int mostMilliseconds = 60'000;
 constexpr std::chrono::milliseconds mostCancelling(1000);
 
-/// What a thread that connects and whoever waits for it both know. The thread may go on when nobody waits any more.
+/// What a thread that connects shares with the one that waits for it. The first may go on when the second has left.
 struct Attempt
 {
     std::mutex mutex;
     std::condition_variable ended;
     bool isEnded = false;
-    bool isAbandoned = false; ///< nobody takes the connection
+    bool isAbandoned = false; ///< the connection is no longer wanted
     bool isTimedOut = false;
     PGconn *connection = nullptr;
 };

@@ -20,7 +20,7 @@ enum class Connecting
 
 /// Connects to a server on a thread of its own, as finding the address of a server may take long and cannot be ended.
 /// @param isToStop  is asked a few times a second
-/// @return how it ended, and the connection, which whoever asks ends; null unless it is done
+/// @return how it ended, and the connection, which the caller finishes; null unless it is done
 /// @throws std::bad_alloc
 std::pair<Connecting, PGconn *> connectTo(const QByteArray &connection, const std::function<bool()> &isToStop);
 

@@ -108,7 +108,7 @@ bool SqliteRows::bindColumns(const SqliteQuery &query, const Variables &variable
     return !error_;
 }
 
-/// Prepares a table anew with the columns alone that are read: a polygon nobody asks for is not fetched.
+/// Prepares a table anew with the columns alone that are read: a polygon that is not needed is not fetched.
 bool SqliteRows::prepareNeeded(const SqliteQuery &query)
 {
     if (query.table.isEmpty()) {

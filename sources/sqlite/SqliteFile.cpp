@@ -50,7 +50,7 @@ int allowReading(void * /*file*/, int action, const char * /*first*/, const char
     }
 }
 
-/// Whether nothing but blanks, comments and semicolons stands in a text.
+/// Whether a text has nothing but blanks, comments and semicolons.
 bool isBlankSql(sqlite3 *database, const char *text)
 {
     while (*text != '\0') {

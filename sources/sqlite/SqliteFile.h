@@ -34,7 +34,7 @@ public:
 
     /// A statement of SQL that was made here.
     SqliteStatement prepare(const QString &sql);
-    /// The statement of a query that somebody wrote: one SELECT and nothing else.
+    /// The statement of a query from outside: one SELECT and nothing else.
     Expected<SqliteStatement> prepareQuery(const QString &sql);
 
     /// Whether it has a table or a view of a name.
@@ -46,7 +46,7 @@ public:
 
     /// What the last call has to say. An answer that means no memory throws `std::bad_alloc`.
     InputError failure(int code) const;
-    /// Whether the file was changed by somebody who did not go through SQLite.
+    /// Whether the file was changed by a program that does not use SQLite.
     std::optional<InputError> changed() const;
 
     /// Ends what is running, from any thread.
@@ -64,7 +64,7 @@ private:
     sqlite3 *database_ = nullptr;
     std::optional<InputError> error_;
     std::atomic<bool> isStopped_ = false;
-    bool hasLog_ = false; ///< other programs may write to it meanwhile, into a log beside it
+    bool hasLog_ = false; ///< other programs may write to it meanwhile, into a separate log
     qint64 size_ = 0;
     QDateTime modified_;
 };

@@ -22,7 +22,7 @@ public:
 
     /// What is wrong with the list of geometries.
     const std::optional<InputError> &error() const { return error_; }
-    /// What is wrong with the list of reference systems, for whoever reads one.
+    /// What is wrong with the list of reference systems, which matters where one is read.
     const std::optional<InputError> &systemsError() const { return systemsError_; }
 
     /// Whether a column of a table holds geometries.
