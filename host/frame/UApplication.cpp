@@ -1,6 +1,7 @@
 #include "UApplication.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace
 {
@@ -49,9 +50,12 @@ std::vector<UDocument *> UApplication::GetDocuments() const
 
 bool UApplication::IsOpen(const void *document) const
 {
-    const std::vector<UDocument *> documents = GetDocuments();
-    return std::any_of(documents.begin(), documents.end(),
-                       [document](const UDocument *open) { return open == document; });
+    // Nothing is collected: it is asked where memory has ended as well.
+    return std::any_of(templates_.begin(), templates_.end(), [document](const auto &docTemplate) {
+        const std::vector<UDocument *> &documents = docTemplate->GetDocuments();
+        return std::any_of(documents.begin(), documents.end(),
+                           [document](const UDocument *open) { return open == document; });
+    });
 }
 
 void UApplication::CloseAllDocuments()
@@ -63,11 +67,15 @@ void UApplication::CloseAllDocuments()
 
 void UApplication::AddToRecentFileList(const QString &path)
 {
-    recentFiles_.removeAll(path);
-    recentFiles_.prepend(path);
-    if (recentFiles_.size() > mostRecentFiles) {
-        recentFiles_.removeLast();
+    // Made anew, so that the list stays as it is when memory ends.
+    QStringList files;
+    files.append(path);
+    for (const QString &file : std::as_const(recentFiles_)) {
+        if (file != path && files.size() < mostRecentFiles) {
+            files.append(file);
+        }
     }
+    recentFiles_ = std::move(files);
 }
 
 void UApplication::OnDocumentEvent(UDocument & /*document*/, UDocument::DocumentEvent /*event*/) {}

@@ -101,6 +101,9 @@ UDocument *UDocTemplate::OpenReportDocumentFile(const QString &path, int /*addTo
     }
     if (!path.isEmpty()) {
         document->SetPathName(path, true);
+        if (document->GetPathName().isEmpty()) {
+            return nullptr; // there is no memory for it, and what is saved later would go elsewhere
+        }
     }
     if (CViewPane::IsOpen(pane)) {
         InitialUpdatePane(pane, document, makeVisible);

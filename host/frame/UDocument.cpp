@@ -2,6 +2,7 @@
 
 #include "AutoDeleteGuard.h"
 #include "CViewPane.h"
+#include "MemoryLasts.h"
 #include "UApplication.h"
 #include "UDocTemplate.h"
 #include "UView.h"
@@ -37,11 +38,15 @@ void UDocument::SetTitle(const QString &title)
 
 void UDocument::SetPathName(const QString &path, bool addToRecentFiles)
 {
-    path_ = path;
-    UDocument::SetTitle(QFileInfo(path).fileName());
-    if (addToRecentFiles && UApplication::Get() != nullptr) {
-        UApplication::Get()->AddToRecentFileList(path);
-    }
+    // What needs memory comes first, so that a document has both the path and the name, or neither.
+    kareport::doneWhileMemoryLasts([&] {
+        const QString name = QFileInfo(path).fileName();
+        if (addToRecentFiles && UApplication::Get() != nullptr) {
+            UApplication::Get()->AddToRecentFileList(path);
+        }
+        path_ = path;
+        UDocument::SetTitle(name);
+    });
 }
 
 void UDocument::AddView(UView *view)

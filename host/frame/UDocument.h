@@ -39,7 +39,7 @@ public:
     virtual void SetTitle(const QString &title);
     /// The full path of the file that the document belongs to; empty for none.
     const QString &GetPathName() const { return path_; }
-    /// Sets the file that the document belongs to; its name becomes the title.
+    /// Sets the file that the document belongs to; its name becomes the title. Without memory, neither changes.
     virtual void SetPathName(const QString &path, bool addToRecentFiles);
 
     /// Whether something has changed since the document was made, loaded or saved.

@@ -10,6 +10,7 @@
 
 #include <cstdio>
 #include <iterator>
+#include <string>
 
 namespace
 {
@@ -99,6 +100,15 @@ constexpr ReportOperation operations[] = {
      [](auto &s, auto &) {
          s.answer = s.report.CopyText();
          return !s.answer.isEmpty();
+     }},
+    {"CopyText, a piece", Text::Same,
+     [](auto &s, auto &) {
+         s.answer = s.report.CopyText(1, 4);
+         return s.answer.size() == 4;
+     }},
+    {"GetData", Text::Same,
+     [](auto &s, auto &) {
+         return std::char_traits<char16_t>::length(s.report.GetData()) == std::size_t(s.report.GetTextLength());
      }},
     {"GetText", Text::Same, [](auto &s, auto &) { return s.report.GetText().size() == s.report.GetTextLength(); }},
     {"CheckSize", Text::Same, [](auto &s, auto &) { return s.report.CheckSize(200000) == 1; }},
@@ -236,6 +246,17 @@ constexpr ReportOperation operations[] = {
          s.report.SetTextObject(&s, 1);
          s.report.SaveText();
          return true;
+     },
+     {.hasView = true}},
+    {"SaveText, to the host's document",
+     Text::Same,
+     [](auto &s, auto &around) {
+         around.receiver->received.clear();
+         s.report.SetTextObject(around.receiver, 1);
+         s.report.SaveText();
+         s.answer = around.receiver->received;
+         EXPECT_EQ(s.report.GetTextObject(), around.receiver) << "another try may follow";
+         return !s.answer.isEmpty();
      },
      {.hasView = true}},
     {"UpdateAllViews",

@@ -133,6 +133,43 @@ constexpr ReportOperation operations[] = {
          s.report.SetPageStarts({});
          return s.report.FindPageStarts() && lostNothing(s);
      }},
+    {"SetPathName",
+     Text::Same,
+     [](auto &s, auto &around) {
+         s.report.SetPathName(around.reportPath, true);
+         const QString path = s.report.GetPathName();
+         EXPECT_TRUE(path.isEmpty() || path == around.reportPath);
+         const QString &title = static_cast<const UDocument &>(s.report).GetTitle(); // which panes show
+         EXPECT_EQ(path.isEmpty(), title != u"s.rep") << "the path and no title, or the other way round";
+         return !path.isEmpty();
+     },
+     {.hasView = true}},
+    {"HoldsRichTextSource", Text::Same, [](auto &s, auto &) { return !s.report.HoldsRichTextSource(); }},
+    {"OnAutoDelete", Text::Same,
+     [](auto &s, auto &) {
+         s.report.OnAutoDelete();
+         return lostNothing(s);
+     }},
+    {"UsePreferredReportEditor", Text::Same,
+     [](auto &s, auto &) {
+         s.report.SetExternalEditorFlag(true);
+         return s.report.UsePreferredReportEditor();
+     }},
+    {"Numbers and flags", Text::Same,
+     [](auto &s, auto &) {
+         s.report.SetMargins(QMargins(1, 2, 3, 4));
+         s.report.SetFontSize(9);
+         s.report.SetZeroBlank(true);
+         s.report.WriteTableName(true);
+         s.report.SetOptionExcel();
+         s.report.SetExternalExcel();
+         s.report.SetOpenedFromRtf(false);
+         s.report.SetCanClose(1);
+         s.report.EnableCloseOption(true);
+         s.report.SetCloseDocumentFlag(false);
+         return s.report.GetMargins() == QMargins(1, 2, 3, 4) && s.report.GetFontSize() == 9 &&
+                s.report.IsZeroBlank() && s.report.IsOptionExcel() && s.report.IsExternalExcel();
+     }},
     {"IsConvertToOpenInWord", Text::Same,
      [](auto &s, auto &) { return s.report.IsConvertToOpenInWord(longName, QStringLiteral("/bin/WinWord.exe")); }},
 };

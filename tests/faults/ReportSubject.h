@@ -14,6 +14,19 @@
 #include <memory>
 #include <vector>
 
+/// A host document that takes the texts that users have written for its objects.
+class TakingDocument : public UDocument
+{
+public:
+    bool OnTextReceived(unsigned /*id*/, const QString &text) override
+    {
+        received = text;
+        return true;
+    }
+
+    QString received;
+};
+
 /// What all reports of these tests share: files, an editor that is only recorded, an application.
 class Surroundings
 {
@@ -44,6 +57,12 @@ public:
     const QString reportPath = folder_.at(QStringLiteral("s.rep"));
     const QString richTextPath = folder_.at(QStringLiteral("s.rtf"));
     ReportApplication application;
+    TakingDocument *const receiver = static_cast<TakingDocument *>(
+        application
+            .AddDocTemplate(std::make_unique<UDocTemplate>(
+                1, [] { return std::make_unique<TakingDocument>(); }, UDocTemplate::PaneFactory(),
+                UDocTemplate::ViewFactory(), QStringLiteral("Objects"), 1, 1))
+            ->OpenReportDocumentFile(QString(), 0, 0, nullptr, 0, nullptr));
 };
 
 /// How a report is made before something is done with it.
@@ -75,7 +94,7 @@ public:
         }
         if (shape.hasView) {
             pane_ = new CountingPane;
-            showIn<TestReportView>(*pane_, report);
+            showIn<TestReportView>(*pane_, report)->plainText = "a text that the user has edited\r\n";
         }
         if (shape.isLoaded) {
             EXPECT_TRUE(report.LoadTemplateXml(QStringLiteral("t.xml"), QStringLiteral("T"), QStringLiteral("Points"),
