@@ -55,7 +55,8 @@ void failEachCall(const QString &path, Prepare prepare, Save save, Failed failed
     }
 }
 
-/// The lines of a report's text of more than is buffered at once.
+/// The lines of a report's text of more than is buffered at once. It is of two bytes a character, and a PDF needs one face
+/// for it.
 inline int longTextLines()
 {
     return testSize(2'000, 10'000);
@@ -63,6 +64,6 @@ inline int longTextLines()
 
 inline const QString &longText()
 {
-    static const QString text = reportLines(QStringLiteral("a line of a report \u6E2C\n").repeated(longTextLines()));
+    static const QString text = reportLines(QStringLiteral("a line of a report \u0142\n").repeated(longTextLines()));
     return text;
 }

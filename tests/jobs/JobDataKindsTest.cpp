@@ -47,7 +47,7 @@ TEST(JobDataKinds, OneReportComesOfTextsOfEveryHabit)
         {"Number;Northing\n1;12.5\n2A;0\n", R"("delimiter": "auto")", "a semicolon that is found out"},
         {"1,12.5\n2A,0\n", R"("header": false, "columns": ["Number", "Northing"])", "columns by their positions"},
         {"a,b,c\n1,?,12.5\n2A,?,0\n", R"("columns": ["Number", "-", "Northing"])", "instead of a header row's names"},
-        {"1,?,12.5\n2A,?,0\n", R"("header": false, "columns": ["Number", null, "Northing"])", "one passed over"},
+        {"1,?,12.5\n2A,?,0\n", R"("header": false, "columns": ["Number", null, "Northing"])", "one skipped"},
         {"1,?,12.5\n2A,?,0\n", R"("header": false, "columns": {"Northing": 3, "Number": 1})", "by their numbers"},
         {"Pt,Hoch\n1,12.5\n2A,0\n", R"("columns": {"Number": "PT", "Northing": "Hoch"})", "by names of the header row"},
         {"1,12.5,9\n2A,0,9\n", R"("header": false, "order": "PN-")", "an order"},

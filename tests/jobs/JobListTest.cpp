@@ -39,7 +39,7 @@ TEST(JobSlice, IsANumberASlashAndACount)
         {"-1/8", 0, 0, "negative"},
         {"+1/8", 0, 0, "a sign"},
         {" 1/8", 0, 0, "a blank"},
-        {"1/8 ", 0, 0, "a blank behind"},
+        {"1/8 ", 0, 0, "a blank after it"},
         {"1/8/2", 0, 0, "two slashes"},
         {"a/b", 0, 0, "no numbers"},
         {"1.5/3", 0, 0, "a broken number"},
@@ -110,7 +110,7 @@ TEST(JobList, HasANameOnEachLine)
     const Row rows[] = {
         {"", {}, "an empty list"},
         {"\n\n \n", {}, "blank lines"},
-        {"a.json", {"a.json"}, "no line end behind the last"},
+        {"a.json", {"a.json"}, "no line end after the last"},
         {"a.json\nb.json\n", {"a.json", "b.json"}, "two"},
         {"a.json\r\nb.json\r\n", {"a.json", "b.json"}, "line ends of another system"},
         {"jobs/my road.json\n", {"jobs/my road.json"}, "a blank in a name"},

@@ -158,8 +158,8 @@ TEST(JobNotes, SayWhichValuesDoNotShowAsTheyAre)
         {"Number,Northing\n1,\n2,5\n,\n", "",
          "2 values of the field \"Northing\" of the table \"Points\" are missing and show as 0, the first one in row 1, "
          "line 4 of the report",
-         "1    |", "a missing text shows as none and is no reason"},
-        {"Number,Northing\n1,\n", R"("options": {"zeroBlank": true}, )", "", "", "blanks are no elevation"},
+         "1    |", "a missing text shows as none and is not a reason"},
+        {"Number,Northing\n1,\n", R"("options": {"zeroBlank": true}, )", "", "", "blanks are not an elevation"},
         {"Number,Northing\n1,2\n2,NAN\n3,-INF\n", "",
          "2 values of the field \"Northing\" of the table \"Points\" are infinite or not a number, the first one in row "
          "2, line 5 of the report",
@@ -345,7 +345,7 @@ TEST(JobNotes, AreErrorsInAStrictJob)
     }
 }
 
-TEST(JobNotes, NameTheUnitsThatNobodySaid)
+TEST(JobNotes, NameTheUnitsThatWereNotSaid)
 {
     struct Row
     {
@@ -394,7 +394,7 @@ TEST(JobNotes, AreWrittenAsJson)
     EXPECT_EQ(first[QStringLiteral("text")].toString(), QStringLiteral("Gr\u00F6\u00DFe"));
     const QJsonObject second = list[1].toObject();
     EXPECT_EQ(second[QStringLiteral("kind")].toString(), QStringLiteral("unfilled-field"));
-    EXPECT_FALSE(second.contains(QStringLiteral("line"))) << "no place is none";
+    EXPECT_FALSE(second.contains(QStringLiteral("line"))) << "no place is not a line";
 }
 
 } // namespace

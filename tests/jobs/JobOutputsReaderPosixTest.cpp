@@ -11,7 +11,7 @@
 namespace
 {
 
-/// Standard output is a pipe that nobody reads.
+/// Standard output is a pipe without a reader.
 class NoReader
 {
 public:
@@ -49,7 +49,7 @@ private:
     void show(std::size_t done) override { last = done; }
 };
 
-TEST(JobOutputsReader, APdfThatNobodyReadsIsNotMadeToItsEnd)
+TEST(JobOutputsReader, APdfWithoutAReaderIsNotMadeToItsEnd)
 {
     const FixedSurroundings surroundings;
     UReportDoc report;
@@ -62,7 +62,7 @@ TEST(JobOutputsReader, APdfThatNobodyReadsIsNotMadeToItsEnd)
         const NoReader noReader;
         result = kareport::writeOutput(report, {QStringLiteral("-"), kareport::OutputKind::Pdf}, progress);
     }
-    EXPECT_TRUE(result.isReaderGone) << "nobody is left to be told";
+    EXPECT_TRUE(result.isReaderGone) << "there is no reader to be told";
     EXPECT_FALSE(result.isWritten());
     EXPECT_LT(progress.last, report.GetPages().size() / 2) << "work of seconds, shown a few times a second";
 }

@@ -42,7 +42,7 @@ TEST(JobRunnerData, AValueThatIsMissingLeavesItsLineOut)
     job.run(templateJob(R"("s": {"values": {"Client": "Harbour Board", "area": 1250.5, "Other": []}})",
                         R"({"block": "Site", "data": "s"})"));
     EXPECT_EQ(job.text(), QStringLiteral("Client|Harbour Board\nArea|1250.500\n"))
-        << "names of variables match without regard to case, others are passed over";
+        << "names of variables match without regard to case, others are skipped";
 }
 
 TEST(JobRunnerData, ReadsCsvOfEveryForm)

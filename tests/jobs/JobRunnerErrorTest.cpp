@@ -19,11 +19,11 @@ TEST(JobRunnerError, OfAStepHasItsPlaceInTheJob)
     constexpr Row rows[] = {
         {R"("p": {"values": []})", R"({"line": "x"}, {"table": @"Nope", "data": "p"})", "Points, Sorted, Stations",
          "no such table: the others are named"},
-        {R"("p": {"values": {}})", R"({"block": @"Points", "data": "p"})", "Site, Point", "a table is no block"},
+        {R"("p": {"values": {}})", R"({"block": @"Points", "data": "p"})", "Site, Point", "a table is not a block"},
         {R"("p": {"values": []})", R"({"table": @"Lost", "data": "p"})", "\"Nowhere\"", "its dictionary is missing"},
         {R"("p": {"values": []})", R"({"block": @"Point", "data": "p"})", "no row", "a block of no rows"},
         {R"("p": {"values": [{"Number": "1"}, @5]})", R"({"table": "Points", "data": "p"})", "an object was expected",
-         "a row that is no object"},
+         "a row that is not an object"},
         {R"("p": {"values": [{}, {"Northing": @"x"}]})", R"({"table": "Points", "data": "p"})", "a number was expected",
          "a value that does not fit"},
         {R"("p": {"values": {"Northing": @true}})", R"({"block": "Point", "data": "p"})", "\"Northing\"",

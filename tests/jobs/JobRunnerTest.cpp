@@ -30,7 +30,7 @@ TEST(JobRunner, TheGivenTitleWinsOverTheTemplates)
         {R"("title": "Stakeout", "report": [{"line": "a"}])", "Stakeout", "the given title"},
         {R"("template": {"file": "t.xml", "name": "T"}, "report": [{"line": "a"}])", "Title", "the template's title"},
         {R"("title": "Stakeout", "template": {"file": "t.xml", "name": "T"}, "report": [{"line": "a"}])", "Stakeout",
-         "the given title is set again behind the template's"},
+         "the given title is set again after the template's"},
         {R"("title": "", "template": {"file": "t.xml", "name": "T"}, "report": [{"line": "a"}])", "",
          "an empty title is one that was given"},
     };
@@ -41,7 +41,7 @@ TEST(JobRunner, TheGivenTitleWinsOverTheTemplates)
     }
 }
 
-TEST(JobRunner, TheApplicationStandsBeforeTheTitle)
+TEST(JobRunner, TheApplicationIsBeforeTheTitle)
 {
     TestJob job;
     job.run(R"("title": "Stakeout", "application": "TALVEN Survey", "report": [{"line": "a"}])");
@@ -70,7 +70,7 @@ TEST(JobRunner, StepsRunInOrder)
     };
     constexpr Row rows[] = {
         {R"([])", "", "nothing to do"},
-        {R"([{"line": "a"}, {"line": "b"}])", "a\nb\n", "one line end behind each"},
+        {R"([{"line": "a"}, {"line": "b"}])", "a\nb\n", "one line end after each"},
         {R"([{"line": "a", "after": 0}, {"line": "b"}])", "ab\n", "an open line"},
         {R"([{"line": "a"}, {"line": "b", "before": 1, "after": 2}, {"line": "c"}])", "a\n\nb\n\nc\n", "blank lines"},
         {R"([{"line": "a", "before": 3}])", "a\n", "blank lines before are dropped at the top of a page"},
@@ -86,7 +86,7 @@ TEST(JobRunner, StepsRunInOrder)
         {R"([{"line": "a"}, {"clear": true}])", "", "cleared at the end"},
         {R"([{"line": "\u00e4\ud834\udd1e\u6e2c"}])", "\xC3\xA4\xF0\x9D\x84\x9E\xE6\xB8\xAC\n", "Unicode"},
         {R"([{"line": ""}])", "\n", "an empty line"},
-        {R"([{"line": "a", "style": 1}])", "a\n", "the style is no part of the text"},
+        {R"([{"line": "a", "style": 1}])", "a\n", "the style is not part of the text"},
     };
     for (const Row &row : rows) {
         TestJob job;
@@ -96,7 +96,7 @@ TEST(JobRunner, StepsRunInOrder)
     }
 }
 
-TEST(JobRunner, AHeadingStandsUnderThePageHeader)
+TEST(JobRunner, AHeadingIsUnderThePageHeader)
 {
     TestJob job;
     job.run(R"("title": "S", "report": [{"heading": "Points", "after": 2}, {"line": "a"}, {"newPage": -1},
@@ -239,7 +239,7 @@ TEST(JobRunner, AReportOfAProgramWithPreferencesIsMadeAsTheJobSays)
     EXPECT_EQ(report.GetFontSize(), 8U);
 }
 
-TEST(JobRunner, TheChainageLabelStandsInTheHeading)
+TEST(JobRunner, TheChainageLabelIsInTheHeading)
 {
     TestJob job;
     const char *const data = R"("p": {"values": {"Chainage": "12+345.678"}})";

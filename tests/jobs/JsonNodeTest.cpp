@@ -24,7 +24,7 @@ JsonSource sourceOf(const QByteArray &json)
     return std::get<JsonSource>(std::move(read));
 }
 
-TEST(JsonSource, ATextThatIsNoObjectIsAnErrorWithItsPlace)
+TEST(JsonSource, ATextThatIsNotAnObjectIsAnErrorWithItsPlace)
 {
     struct Row
     {
@@ -37,16 +37,16 @@ TEST(JsonSource, ATextThatIsNoObjectIsAnErrorWithItsPlace)
         {" \n ", "", "a file of white space"},
         {"[]", "1:1", "a list"},
         {"\"text\"", "1:", "a text"},
-        {"{", "1:", "cut off behind the first character"},
+        {"{", "1:", "cut off after the first character"},
         {"{\"report\": [\n{\"line\": \"a\"},\n{\"line\": \"b", "3:", "cut off in the middle of a text"},
         {"{\"report\": [\n{\"line\": \"a\"},\n", "", "cut off in the middle of a list"},
         {"{\"a\": 1,\n \"b\": }", "2:", "a value is missing"},
         {"{\"a\": 1,\n \"b\" 2}", "2:", "a colon is missing"},
         {"{\"a\": 1\n\n \"b\": 2}", "3:", "a comma is missing"},
-        {"{\"a\": 1,\n \"b\": yes}", "2:", "a word that is none"},
+        {"{\"a\": 1,\n \"b\": yes}", "2:", "a word that is not known"},
         {"{'a': 1}", "1:", "single quotes"},
         {"{\n\"a\": \"\xFF\"}", "2:", "a text that is not UTF-8"},
-        {"{}\n{}", "2:", "something behind the object"},
+        {"{}\n{}", "2:", "something after the object"},
         {QByteArray("\0\1\2\3", 4), "1:", "binary"},
     };
     for (const Row &row : rows) {
@@ -78,7 +78,7 @@ TEST(JsonSource, AFileThatCannotBeReadIsAnError)
     EXPECT_EQ(std::get<JsonSource>(read).path(), folder.path("job.json"));
 }
 
-TEST(JsonSource, AByteOrderMarkIsPassedOver)
+TEST(JsonSource, AByteOrderMarkIsSkipped)
 {
     JsonSource source = sourceOf("\xEF\xBB\xBF{\"title\": 1}");
     std::optional<InputError> error;
@@ -109,7 +109,7 @@ TEST(JsonNode, ReadsValues)
     EXPECT_FALSE(error.has_value()) << "what is missing falls back";
 }
 
-TEST(JsonNode, AnotherTypeFailsTheSourceWhereTheValueStands)
+TEST(JsonNode, AnotherTypeFailsTheSourceWhereTheValueIs)
 {
     using Read = void (*)(const JsonNode &);
     constexpr Read text = [](const JsonNode &node) { node.text(); };
@@ -126,7 +126,7 @@ TEST(JsonNode, AnotherTypeFailsTheSourceWhereTheValueStands)
     };
     constexpr Row rows[] = {
         {"{\"a\":\n @1}", text, "a text was expected", "a number for a text"},
-        {"{\"a\": @null}", text, "a text was expected", "null is no text"},
+        {"{\"a\": @null}", text, "a text was expected", "null is not a text"},
         {"{\"a\": @1}", boolean, "true or false was expected", "1 is not true"},
         {"{\"a\": @\"true\"}", boolean, "true or false was expected", "a text is not true"},
         {"{\"a\": @0}", whole, "a whole number from 1 to 9 was expected", "too small"},
@@ -152,7 +152,7 @@ TEST(JsonNode, AnotherTypeFailsTheSourceWhereTheValueStands)
     }
 }
 
-TEST(JsonNode, AnUnknownKeyFailsWhereTheKeyStands)
+TEST(JsonNode, AnUnknownKeyFailsWhereTheKeyIs)
 {
     const MarkedText marked("{\"title\": \"a\",\n  \"colour\": {@\"rad\": 1}}");
     JsonSource source = sourceOf(marked.text);
@@ -164,7 +164,7 @@ TEST(JsonNode, AnUnknownKeyFailsWhereTheKeyStands)
     EXPECT_EQ(error->text, QStringLiteral("unknown key \"rad\": red, green expected; did you mean \"red\"?"));
 }
 
-TEST(JsonNode, WhatIsMissingIsMissedWhereItsParentStands)
+TEST(JsonNode, WhatIsMissingIsMissedWhereItsParentIs)
 {
     const MarkedText marked("{\"a\": [1,\n @{\"b\": 2}]}");
     JsonSource source = sourceOf(marked.text);
@@ -210,7 +210,7 @@ TEST(JsonSource, SetPutsAValueWhereTheDotsLead)
         {"page", "{\"lines\": [1]}", R"({"page":{"lines":[1]},"report":[{"after":1}],"title":"T"})", "a whole object"},
         {"report.0.after", "3", R"({"page":{"lines":72},"report":[{"after":3}],"title":"T"})", "an element's member"},
         {"report.0", "5", R"({"page":{"lines":72},"report":[5],"title":"T"})", "an element"},
-        {"report.1", "5", nullptr, "behind the last element"},
+        {"report.1", "5", nullptr, "after the last element"},
         {"report.-1", "5", nullptr, "before the first element"},
         {"report.x", "5", nullptr, "an element by a name"},
         {"title.x", "5", nullptr, "inside a text"},
@@ -253,7 +253,7 @@ TEST(JsonSource, WhatIsSetIsATextWhereATextIsExpected)
     }
 }
 
-TEST(JsonSource, AKeyThatStandsTwiceIsAnErrorWithBothPlaces)
+TEST(JsonSource, AKeyThatOccursTwiceIsAnErrorWithBothPlaces)
 {
     const auto read =
         JsonSource::fromBytes(job, "{\"report\": [],\n \"data\": {\"d\": {\"values\": {\"A\": 1,\n  \"A\": 2}}}}");
@@ -336,7 +336,7 @@ TEST(JsonSource, WhatIsSetLaterReplacesWhatWasSetInsideIt)
     ASSERT_FALSE(source.set(QStringLiteral("page.name"), QStringLiteral("5")));
     ASSERT_FALSE(source.set(QStringLiteral("page"), QStringLiteral("{\"name\": 7}")));
     JsonNode(source, error)[QStringLiteral("page")][QStringLiteral("name")].text();
-    EXPECT_TRUE(error.has_value()) << "the number 7 is no text, whatever was set before";
+    EXPECT_TRUE(error.has_value()) << "the number 7 is not a text, whatever was set before";
 }
 
 TEST(JsonSource, AJobWithoutAFileHasNoPlaces)

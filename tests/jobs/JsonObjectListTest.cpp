@@ -92,9 +92,9 @@ TEST(JsonObjectList, StoresMembersByTheTypeOfTheVariable)
         {VARIABLE_FLAG, R"({"V": 1})", "1 1", "1"},
         {VARIABLE_FLAG, R"({"V": 0})", "1 0", "0"},
         {VARIABLE_FLAG, R"({"V": "*"})", "1 1", "a star"},
-        {VARIABLE_DOUBLE, R"({"V": null})", "none", "null is no value"},
-        {VARIABLE_TEXT, R"({"V": ""})", "none", "an empty text is no value"},
-        {VARIABLE_DOUBLE, R"({"V": ""})", "none", "an empty text is no value"},
+        {VARIABLE_DOUBLE, R"({"V": null})", "none", "null means no value"},
+        {VARIABLE_TEXT, R"({"V": ""})", "none", "an empty text means no value"},
+        {VARIABLE_DOUBLE, R"({"V": ""})", "none", "an empty text means no value"},
         {VARIABLE_DOUBLE, R"({})", "none", "no member"},
         {VARIABLE_DOUBLE, R"({"W": [1, {}], "X": {"V": 1}, "Y": true})", "none", "what the dictionary does not know"},
     };
@@ -157,7 +157,7 @@ TEST(JsonObjectList, AValueThatDoesNotFitIsAnErrorWithItsPlace)
     }
 }
 
-TEST(JsonObjectList, AnElementThatIsNoObjectIsAnError)
+TEST(JsonObjectList, AnElementThatIsNotAnObjectIsAnError)
 {
     auto read = JsonSource::fromBytes(QStringLiteral("job.json"), "{\"values\": [{},\n 5]}");
     auto &source = std::get<JsonSource>(read);
@@ -229,7 +229,7 @@ TEST(JsonObjectList, EndsWhenTheWorkIsStopped)
         ++count;
     }
     EXPECT_EQ(count, 512U);
-    EXPECT_FALSE(list.error()) << "stopping is no error";
+    EXPECT_FALSE(list.error()) << "stopping is not an error";
 }
 
 } // namespace

@@ -35,7 +35,7 @@ const Row rows[] = {
     {"{}", {}, "1:1", "1:1", "the root itself"},
     {" \n\t {}", {}, "2:3", "2:3", "white space in front; a tab is one column"},
     {R"({"a": 1})", path({name("a")}), "1:2", "1:7", "a member's name and its value"},
-    {R"({"a":1})", path({name("a")}), "1:2", "1:6", "no blank behind the colon"},
+    {R"({"a":1})", path({name("a")}), "1:2", "1:6", "no blank after the colon"},
     {"\xEF\xBB\xBF{\"a\": 1}", path({name("a")}), "1:2", "1:7", "a byte-order mark takes no column"},
     {"{\n  \"a\"\n :\n   1}", path({name("a")}), "2:3", "4:4", "name and value in lines of their own"},
     {"{\r\n \"a\":1}", path({name("a")}), "2:2", "2:6", "lines that end with CR LF"},
@@ -59,7 +59,7 @@ const Row rows[] = {
     {R"({"b": 1})", path({name("a")}), "none", "none", "no such member"},
     {R"({})", path({name("a")}), "none", "none", "no member at all"},
     {R"({"a": []})", path({name("a"), qsizetype(0)}), "none", "none", "no element at all"},
-    {R"({"a": [1]})", path({name("a"), qsizetype(1)}), "none", "none", "behind the last element"},
+    {R"({"a": [1]})", path({name("a"), qsizetype(1)}), "none", "none", "after the last element"},
     {R"({"a": [1]})", path({name("a"), qsizetype(-1)}), "none", "none", "before the first element"},
     {R"({"a": [1]})", path({name("a"), name("0")}), "none", "none", "a name leads into no list"},
     {R"({"a": {"0": 1}})", path({name("a"), qsizetype(0)}), "none", "none", "an index leads into no object"},
@@ -84,7 +84,7 @@ TEST(JsonPlaces, FindsTheLastOfManyElements)
     EXPECT_EQ(placeText(placeInJson(json, path({qsizetype(10000), name("n")}))), QStringLiteral("10001:7"));
 }
 
-TEST(JsonPlaces, FindsAKeyThatStandsTwice)
+TEST(JsonPlaces, FindsAKeyThatOccursTwice)
 {
     struct RepeatedRow
     {
@@ -95,11 +95,11 @@ TEST(JsonPlaces, FindsAKeyThatStandsTwice)
     constexpr RepeatedRow repeatedRows[] = {
         {R"({"a": 1, "a": 2})", "a 1:10 1", "in the root"},
         {"{\"a\": 1,\n \"b\": 2,\n \"a\": 3}", "a 3:2 1", "lines below"},
-        {"\xEF\xBB\xBF{\"a\": 1,\n \"a\": 3}", "a 2:2 1", "behind a byte-order mark"},
+        {"\xEF\xBB\xBF{\"a\": 1,\n \"a\": 3}", "a 2:2 1", "after a byte-order mark"},
         {R"({"x": {"y": {"a": 1, "a": 2}}})", "a 1:22 1", "in an object inside others"},
         {R"({"x": [[{"b": 0}, {"a": 1, "a": 2}]]})", "a 1:28 1", "in an object of a list"},
         {R"({"a": {"a": [{"a": 1}, {"a": 2}]}, "b": "a"})", "none", "in objects of their own"},
-        {R"({"a": "b", "b": "a", "c": ["a", "a"]})", "none", "texts are no keys"},
+        {R"({"a": "b", "b": "a", "c": ["a", "a"]})", "none", "texts are not keys"},
         {R"({"a": 1, "A": 2})", "none", "case matters"},
         {R"({"a": 1, "\u0061": 2})", "a 1:10 1", "the second one written with an escape"},
         {R"({"\u0061": 1, "a": 2})", "a 1:15 1", "the first one written with an escape"},
@@ -150,7 +150,7 @@ TEST(JsonPlaces, PlacesAByte)
         {"ab\ncd", 2, "1:3", "the line end belongs to its line"},
         {"ab\ncd", 3, "2:1", "the first byte of a line"},
         {"ab\ncd", 5, "2:3", "the end"},
-        {"ab\ncd", 99, "2:3", "behind the end is the end"},
+        {"ab\ncd", 99, "2:3", "after the end is the end"},
         {"ab\ncd", -1, "1:1", "before the beginning is the beginning"},
         {"\xC3\xA4"
          "b",

@@ -92,7 +92,7 @@ TEST(LandXmlData, WhatIsSaidOfTheFileIsNoted)
         job.notes.said().front().message().endsWith(u"road.xml: note: Roadways: 1 in the file, which no list reads"));
     EXPECT_TRUE(job.notes.toJson().contains("\"kind\": \"passed-over\""));
     run(job, points, pointsStep, road("<Roadways/>"), strict);
-    EXPECT_FALSE(job.error) << "nobody can do anything about it";
+    EXPECT_FALSE(job.error) << "nothing can be done about it";
 
     const QByteArray twice = "\n<CgPoints><CgPoint name='A1'>1 2</CgPoint></CgPoints>";
     run(job, points, pointsStep, road(twice));

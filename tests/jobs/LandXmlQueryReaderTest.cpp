@@ -120,7 +120,7 @@ TEST(LandXmlQueryReader, MistakesHaveTheirPlace)
         {R"({"list": "stations", "stations": [@null]})", "a number", "nothing"},
         {R"({"list": "stations", "offsets": [@"5"]})", "a number", "a text"},
         {R"({"list": "stations", "offsets": [@{"crossfall": 5}]})", "\"offset\"", "a height nowhere"},
-        {R"({"list": "stations", "offsets": [{"offset": 5, @"fall": 5}]})", "\"fall\"", "a key that nobody knows"},
+        {R"({"list": "stations", "offsets": [{"offset": 5, @"fall": 5}]})", "\"fall\"", "a key that is not known"},
         {R"({"list": "stations", "offsets": [{"offset": 5, "crossfall": @5000}]})", "-1000 to 1000", "a wall"},
         {R"({"list": "elements", "tolerance": @5})", "an object", "a number"},
         {R"({"list": "elements", "tolerance": {"mm": @-1}})", "a number from 0", "below zero"},

@@ -148,7 +148,7 @@ TEST(CommandLineData, NotesAreSaidAndWritten)
         EXPECT_EQ(folder.bytesOf("a.txt"), text) << "nothing is written";
     }
     EXPECT_EQ(folder.bytesOf("strict.json"), folder.bytesOf("notes.json"));
-    // What is no mistake ends no strict job, and is no error in it.
+    // What is not a mistake does not end a strict job, and is not an error in it.
     folder.put("road.xml", R"(<?xml version="1.0"?>
 <LandXML xmlns="http://www.landxml.org/schema/LandXML-1.2" version="1.2">
 <Units><Metric linearUnit="meter" areaUnit="squareMeter" volumeUnit="cubicMeter" temperatureUnit="celsius" pressureUnit="HPA"/></Units>

@@ -139,7 +139,7 @@ TEST(CommandLineMemory, DoesNotGrowWithTheRows)
             "CREATE TABLE points (Number TEXT, Northing REAL, rest TEXT); WITH RECURSIVE i(n) AS (SELECT 1 UNION ALL "
             "SELECT n + 1 FROM i WHERE n < " +
                 QByteArray::number(count) +
-                ") INSERT INTO points SELECT 1000000000 + n, n / 10.0, 'something that nobody reads' FROM i");
+                ") INSERT INTO points SELECT 1000000000 + n, n / 10.0, 'something that is not read' FROM i");
     };
     const auto peaks = [&](int count) {
         putData(count);

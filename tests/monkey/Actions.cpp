@@ -312,7 +312,7 @@ void changeFile(World &world, Chance &chance)
     } else {
         QFile file(path);
         if (file.open(QIODevice::Append)) {
-            file.write("written by somebody else\r\r\n");
+            file.write("written by another program\r\r\n");
         }
     }
     world.wait(450);
@@ -378,7 +378,7 @@ void failEditor(World &world, Chance & /*chance*/)
 {
     kareport::DeskPreferences preferences = kareport::loadPreferences();
     preferences.usesEditor = true;
-    preferences.editor = world.files().filePath(QStringLiteral("plain.txt")); // a file that is no program
+    preferences.editor = world.files().filePath(QStringLiteral("plain.txt")); // a file that is not a program
     kareport::savePreferences(preferences);
 }
 

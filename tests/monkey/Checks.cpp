@@ -41,13 +41,13 @@ QString nameOf(const UReportDoc &report)
 /// In which an editor has started, or the desk has seen that it has ended.
 constexpr int editorTime = 1500; // milliseconds
 
-/// Whether somebody can see a report, or an editor outside holds it.
+/// Whether a report can be seen, or an editor outside holds it.
 bool isWithinReach(const UReportDoc &report, const QDir &folder)
 {
     return report.IsShown() || (report.GetExternalEditorFlag() && isEditorOpen(folder));
 }
 
-/// Where two texts part, for whoever reads the log.
+/// Where two texts begin to differ, for the log.
 QString difference(const QString &one, const QString &other)
 {
     const auto [a, b] = std::mismatch(one.begin(), one.end(), other.begin(), other.end());
@@ -77,8 +77,8 @@ bool World::isRich(const UReportDoc &report)
 
 bool World::showsRich(const UReportDoc &report, const QString &shown)
 {
-    // What was edited in a view with formats is the report's text without them. What somebody types that reads like rich
-    // text stands there as it is.
+    // What was edited in a view with formats is the report's text without them. What is typed and reads like rich
+    // text is there as it is.
     return asShown(shown) == asShown(textOf(report)) || asShown(shown) == asShown(kareport::shownPlainText(report));
 }
 
@@ -122,7 +122,7 @@ QString World::checkClosed() const
             continue;
         }
         if (--given < 0) {
-            return nameOf(gone) + QStringLiteral(" was closed with changes that nobody gave up") +
+            return nameOf(gone) + QStringLiteral(" was closed with changes that were not given up") +
                    describeWritten(gone.text);
         }
     }
@@ -183,7 +183,7 @@ QString World::checkWindows()
     if (lost() != nullptr) {
         wait(editorTime); // an editor starts, or the desk sees that it has ended
         if (const UReportDoc *report = lost()) {
-            return QStringLiteral("nobody can see %1").arg(nameOf(*report));
+            return QStringLiteral("%1 cannot be seen").arg(nameOf(*report));
         }
     }
     for (const UReportDoc *report : reports()) {

@@ -39,19 +39,18 @@ QString seenOf(View rich)
     return plainLines(document.toPlainText());
 }
 
-/// Whether a rich text shows what a report shows: the report's text, read as characters or as the bytes of a file, or as it
-/// stands.
+/// Whether a rich text shows what a report shows: the report's text, read as characters or as the bytes of a file, or as it is.
 bool showsSame(const QByteArray &rich, const QString &text)
 {
     const QString seen = seenOf(QByteArrayView(rich));
     if (seen == plainLines(text)) {
-        return true; // also what somebody typed that reads like rich text
+        return true; // also what was typed and reads like rich text
     }
     return kareport::isRichText(text) &&
            (seen == seenOf(QStringView(text)) || seen == seenOf(QByteArrayView(text.toLatin1())));
 }
 
-/// Whether a file holds a text, as whoever opens it reads it.
+/// Whether a file holds a text, as it is read when it is opened.
 bool loadsAs(const QString &path, const QString &text)
 {
     QFile file(path);

@@ -125,7 +125,7 @@ QString difference(const QStringList &sheets, const std::vector<Page> &pages)
                                   : QStringLiteral("%1 pages have %2 sheets").arg(pages.size()).arg(sheets.size());
 }
 
-/// The text of each sheet of a PDF, as somebody else's program reads it.
+/// The text of each sheet of a PDF, as another program reads it.
 QStringList sheetsOf(const QByteArray &pdf)
 {
     QProcess reader;
@@ -166,7 +166,7 @@ QByteArray World::printOf(UReportView &view) const
                                   QString(), QPageSize::ExactMatch));
     kareport::PrintInfo info;
     info.printer = &printer;
-    info.preview = true; // nobody is asked
+    info.preview = true; // nothing is asked
     if (!view.OnPreparePrinting(info)) {
         return {};
     }

@@ -6,7 +6,7 @@ namespace monkey
 {
 
 /// How a worker says what came of its steps: by its status, and by files in its folder. None of these is what a program
-/// that could not be started, or was ended by somebody else, ends with.
+/// that could not be started, or was ended from outside, ends with.
 constexpr int workerIsDone = 11;
 constexpr int workerHasFound = 10;
 inline const QString stepsName = QStringLiteral("steps");

@@ -277,7 +277,7 @@ QString World::newPath(Chance &chance) const
 void World::crash()
 {
     limitFiles(-1); // what cannot be kept cannot come back
-    // What the desk does every few seconds: what is open stands on the disk after it.
+    // What the desk does every few seconds: what is open is on the disk after it.
     for (QTimer *timer : frame_->findChildren<QTimer *>()) {
         constexpr int keepInterval = 5000;
         if (timer->interval() == keepInterval) {

@@ -25,7 +25,7 @@ namespace monkey
 struct Seen
 {
     const UReportDoc *report = nullptr;
-    quint64 id = 0; ///< of the report: another one may come to stand at its place in memory
+    quint64 id = 0; ///< of the report: another one may come to its place in memory
     QString text;
     bool isModified = false;
     QString path;
@@ -45,7 +45,7 @@ struct Stamp
 class World
 {
 public:
-    /// @param folder  everything that the desk reads and writes stands below it
+    /// @param folder  everything that the desk reads and writes is below it
     explicit World(const QString &folder);
     ~World();
     World(const World &) = delete;
@@ -62,7 +62,7 @@ public:
     static std::vector<UReportDoc *> reports();
     static QString textOf(const UReportDoc &report);
     static qsizetype pagesOf(const UReportDoc &report);
-    /// The views of all reports that stand on the screen now: in a pane that is shown, and not below another tab.
+    /// The views of all reports that are on the screen now: in a pane that is shown, and not below another tab.
     static std::vector<UReportView *> viewsOnScreen();
     /// The view whose text has the keyboard; null when none has.
     static UReportView *viewWithKeyboard();
@@ -90,7 +90,7 @@ public:
 
     // What the step that runs says of itself.
     std::set<const UReportDoc *> mayChange; ///< texts that it edits
-    bool mayReload = false;                 ///< files were changed by somebody else
+    bool mayReload = false;                 ///< files were changed by another program
     QString did;                            ///< in words, for the log
 
 private:
@@ -119,7 +119,7 @@ private:
     /// Whether a view that shows formats, or rich text, shows what the report holds.
     static bool showsRich(const UReportDoc &report, const QString &shown);
     QString checkSaved(const UReportDoc &report, const Seen &was);
-    /// The reports that stand in their files as they are now.
+    /// The reports whose files hold them as they are now.
     std::vector<UReportDoc *> savedReports() const;
     /// Opens a file that a report was saved in, or a copy of it. @return what is wrong with what is opened; empty when nothing is
     QString openSaved(const UReportDoc &report, const QString &copy, bool byCommand);
@@ -138,7 +138,7 @@ private:
     QString checkWindows();
     QString checkActive() const;
     QString checkPages();
-    /// How the panes stand, for whoever reads the log.
+    /// Where the panes are, for the log.
     QString describePanes() const;
 
     QDir folder_;

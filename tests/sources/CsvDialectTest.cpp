@@ -82,8 +82,8 @@ TEST(CsvDialect, BlanksAndTabsDelimit)
          "Number Description\n1 \"a b\"\n2 \"say \"\"x\"\"\"\n",
          {"number=1 description=a b", "number=2 description=say \"x\""},
          "quotes hold blanks"},
-        {spaced(), "Number Northing\n1 \"\"\n", {"number=1"}, "an empty cell stands in quotes"},
-        {spaced(), "Number Northing\n1 2\n \t\n\n", {"number=1 northing=2"}, "blank lines at the end are no rows"},
+        {spaced(), "Number Northing\n1 \"\"\n", {"number=1"}, "an empty cell is in quotes"},
+        {spaced(), "Number Northing\n1 2\n \t\n\n", {"number=1 northing=2"}, "blank lines at the end are not rows"},
         {spaced(), "Number Northing\n1 2 3\n", {"error 2:5 the row has 3 cells: 2 were expected"}, "a cell too many"},
         {spaced(), "Number Northing\n1\n", {"error 2:1 the row has 1 cells"}, "a cell too few"},
         {spaced(), "Number Northing\n  \n1 2\n", {"error 2:1 the row has 0 cells"}, "a blank line inside"},
@@ -101,11 +101,11 @@ TEST(CsvDialect, BlanksAndTabsDelimit)
          QByteArray("Number Northing\n1 2\0\n", 21),
          {"error 2:4 the file contains a zero byte"},
          "a zero byte"},
-        {spaced(), "Number Northing\n1 \xFF\n", {"error 2:3 the file is not UTF-8"}, "a byte that is no character"},
+        {spaced(), "Number Northing\n1 \xFF\n", {"error 2:3 the file is not UTF-8"}, "a byte that is not a character"},
         {spaced(),
          "Number Northing\n1 " + QByteArray(1 << 20, '2') + "\n",
          {"error 2:1 the row is longer than"},
-         "a row that is none"},
+         "a row that is not one"},
         {spaced(),
          "Number,Northing\n1,2\n",
          {"error 1:1 no column of the header row is a variable"},
@@ -135,7 +135,7 @@ TEST(CsvDialect, AnOrderNamesTheColumns)
         {ordered("PNEZD"),
          "Number,N,E,Z,D\n",
          {"error 1:8 the cell \"N\" of the column \"Northing\""},
-         "a header row that nobody told of"},
+         "a header row that was not announced"},
         {ordered("PNEZD"), "", {}, "no row"},
         {ordered("P-"), "1,2\n", {"number=1"}, "one of two"},
         {ordered("PP"), "1,2\n", {"error \"PP\" is not an order of columns"}, "a letter twice"},
@@ -150,11 +150,11 @@ TEST(CsvDialect, AnOrderNamesTheColumns)
         {ordered("PZ", {{"Station", 3}}),
          "1,2\n",
          {"error there is no column 3: one of 1 to 2 was expected"},
-         "a column that is none"},
+         "a column that does not exist"},
     });
     CsvDialect withHeader = ordered("PN");
     withHeader.hasHeader = true;
-    check({{withHeader, "Northing,Number\n1,2\n", {"number=1 northing=2"}, "a header row is passed over"},
+    check({{withHeader, "Northing,Number\n1,2\n", {"number=1 northing=2"}, "a header row is skipped"},
            {withHeader, "", {"error 1:1 a header row was expected"}, "a header row is missing"},
            {withHeader,
             "1,2\n2,3\n",
@@ -247,7 +247,7 @@ TEST(CsvDialect, NumbersHaveTheirMarks)
          "Number;Northing\n1,5;-,5e3\n",
          {"number=1,5 northing=-500"},
          "texts stay as they are"},
-        {numbered(';', ',', ""), "Northing\n2.5\n", {"error 2:1 the cell \"2.5\""}, "a point is no decimal comma"},
+        {numbered(';', ',', ""), "Northing\n2.5\n", {"error 2:1 the cell \"2.5\""}, "a point is not a decimal comma"},
         {numbered(';', ',', ""), "Northing\n2,5,5\n", {"error 2:1 the cell \"2,5,5\""}, "two commas"},
         {numbered(';', ',', ""), "Northing\nINF\n\n", {"northing=inf"}, "infinite"},
         {numbered(';', ',', "."),
@@ -278,13 +278,13 @@ TEST(CsvDialect, NumbersHaveTheirMarks)
          "Station;Offset\n12+345,5;3,2 L\n",
          {"station=12345.5 offset=-3.2"},
          "in stations and offsets"},
-        {numbered(';', ',', " "), "Offset\n1 003,2 L\n", {"offset=-1003.2"}, "the blank before a side is no mark"},
+        {numbered(';', ',', " "), "Offset\n1 003,2 L\n", {"offset=-1003.2"}, "the blank before a side is not a mark"},
         {numbered(';', ',', ""), "Bearing\nS 45-30-36,0 W\n", {"bearing=225.51"}, "in bearings"},
         {numbered(';', ',', ""), "Count;Flag\n5;*\n", {"count=5 flag=yes"}, "whole numbers and flags"},
     });
 }
 
-TEST(CsvDialect, LinesArePassedOver)
+TEST(CsvDialect, LinesAreSkipped)
 {
     check({
         {passing(2, {}, false),
@@ -307,13 +307,13 @@ TEST(CsvDialect, LinesArePassedOver)
         {passing(0, '#', false),
          "#\n#x\nNumber,Count\n\n1,x\n",
          {"error 4:1 the row has 1 cells"},
-         "a blank line is no comment"},
+         "a blank line is not a comment"},
         {passing(0, {}, true),
          "\nNumber,Count\n\n1,2\n \t\r\n2,3\n\n",
          {"number=1 count=2", "number=2 count=3"},
          "blank lines"},
         {passing(0, {}, true), "Number,Count\n\n\n1,x\n", {"error 4:3 the cell \"x\""}, "they count as lines"},
-        {passing(0, {}, true), "Number\n \n1\n", {"number=1"}, "a blank line is no point's number then"},
+        {passing(0, {}, true), "Number\n \n1\n", {"number=1"}, "a blank line is not a point's number then"},
         {passing(1, ';', true), "x\n;\n\n;y\nNumber,Count\n1,2\n;\n\n", {"number=1 count=2"}, "all of them"},
         {passing(0, '#', false),
          "# nothing else",

@@ -87,11 +87,11 @@ TEST(CsvObjectListSort, AMistakeInASortedFileHasItsPlace)
     };
     constexpr Row rows[] = {
         {"Count,Northing\n3,1\nx,2\n1,3\n", "3:1", "in a sort key"},
-        {"Count,Northing\n3,1\n2,x\n1,3\n", "3:3", "in a cell that is no sort key"},
+        {"Count,Northing\n3,1\n2,x\n1,3\n", "3:3", "in a cell that is not a sort key"},
         {"Count,Northing\n3,x\n1,y\n", "2:3", "the first of the file, though the other one is met before"},
         {"Count,Northing\n3,1\n2,2,2\n1,3\n", "3:5", "a cell too many"},
         {"Count,Northing\n3,1\n2,2\n1,\"3\n", "4:3", "a quote that is not closed, in the last row"},
-        {"Count,Note\n3,\"a\nb\"\n2,c\n1,\"d\n\ne\"\n0,f\nx,g\n", "9:1", "behind cells of several lines"},
+        {"Count,Note\n3,\"a\nb\"\n2,c\n1,\"d\n\ne\"\n0,f\nx,g\n", "9:1", "after cells of several lines"},
     };
     for (const Row &row : rows) {
         const CsvFile file(row.content);

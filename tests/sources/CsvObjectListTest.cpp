@@ -68,24 +68,24 @@ TEST(CsvObjectList, NamesOfColumnsAreTakenWithoutBlanksAroundThem)
         const char *reason;
     };
     constexpr Row rows[] = {
-        {"Number, Northing, Note, Count", "a blank behind each delimiter"},
+        {"Number, Northing, Note, Count", "a blank after each delimiter"},
         {"Number ,Northing\t,Note  ,Count", "blanks and tabs before it"},
         {"\" Number\",\"Northing \",Note,Count", "inside quotes"},
         {"\xC2\xA0Number,Northing\xE2\x80\xAF,\xE2\x80\x87Note,Count", "blanks that do not break a line"},
         {"\xEF\xBB\xBF\xEF\xBB\xBFNumber,Northing,Note,Count", "a second byte-order mark"},
         {"Number,\xEF\xBB\xBFNorthing,Note\xE2\x80\x8B,\xE2\x81\xA0"
          "Count",
-         "marks that nobody sees"},
+         "marks that are not seen"},
         {"Number,Northing,Note,Count ", "at the end of the line"},
     };
     for (const Row &row : rows) {
         const CsvFile file(QByteArray(row.header) + "\r\n A , 12.5 , a b , 3 \r\n");
         EXPECT_EQ(textOf(file.list->GetAt(0)), QStringLiteral(" A |12.5| a b |3"))
-            << row.reason << ": what stands in texts stays";
+            << row.reason << ": what is in texts stays";
         EXPECT_FALSE(file.list->error()) << row.reason;
     }
     const CsvFile unnamed("Number, ,Remark, Remark ,,\n1,2,3,4,5,6\n");
-    EXPECT_EQ(textOf(unnamed.list->GetAt(0)), QStringLiteral("1|-|-|-")) << "what nobody knows may stand twice";
+    EXPECT_EQ(textOf(unnamed.list->GetAt(0)), QStringLiteral("1|-|-|-")) << "what is not known may be there twice";
 }
 
 TEST(CsvObjectList, AnEmptyCellLeavesWhatAnotherVariableOfItsIdentifierHasStored)
@@ -189,7 +189,7 @@ TEST(CsvObjectList, EndsWhereItIsStopped)
     }
     EXPECT_LT(index, 100000U);
     EXPECT_EQ(calls, 3);
-    EXPECT_FALSE(file.list->error()) << "to be stopped is no mistake of the file";
+    EXPECT_FALSE(file.list->error()) << "to be stopped is not a mistake of the file";
     EXPECT_EQ(file.list->GetAt(0), nullptr);
     EXPECT_EQ(calls, 3) << "it stays stopped";
 }
@@ -219,8 +219,7 @@ TEST(CsvObjectList, EveryMistakeHasItsPlace)
         {"Number,Northing\n1,2\n2,x\n", "3:3", "\"x\"", "a cell that does not fit is quoted"},
         {"Number,Northing\n1,2\n2,1e999\n", "3:3", "\"1e999\"", "a number out of range"},
         {"Count,Northing\n1,2\n\"1.5\",2\n", "3:1", "\"1.5\"", "a quoted cell: its quote is the place"},
-        {"Note,Count\n\"a\nb\",x\n", "3:4", "\"Count\"",
-         "the column is named; the cell stands in the row's second line"},
+        {"Note,Count\n\"a\nb\",x\n", "3:4", "\"Count\"", "the column is named; the cell is in the row's second line"},
         {"Note,Count\n\xC3\xA4\xF0\x9D\x84\x9E,x\n", "2:4", "a whole number", "columns count characters"},
         {"Number,Count\n1,2\n\n3,4\n", "3:1", "1 cells", "a blank line inside"},
     };

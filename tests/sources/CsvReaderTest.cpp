@@ -57,8 +57,8 @@ TEST(CsvReader, ReadsRowsAndCells)
          "a,b",
          ',',
          {{"a", "b"}},
-         "a byte-order mark is no part of the first cell"},
-        {"\xEF\xBB\xBF\"a\",b", ',', {{"a", "b"}}, "a quoted cell behind a byte-order mark"},
+         "a byte-order mark is not part of the first cell"},
+        {"\xEF\xBB\xBF\"a\",b", ',', {{"a", "b"}}, "a quoted cell after a byte-order mark"},
         {",", ',', {{"", ""}}, "two empty cells"},
         {"a,,b,\n", ',', {{"a", "", "b", ""}}, "empty cells, the last one too"},
         {" a , b ", ',', {{" a ", " b "}}, "blanks are part of a cell"},
@@ -72,7 +72,7 @@ TEST(CsvReader, ReadsRowsAndCells)
         {"\"a\nb\",c\nd,e", ',', {{"a\nb", "c"}, {"d", "e"}}, "a quoted cell over two lines"},
         {"\"a\r\nb\r\n\r\n\",c", ',', {{"a\r\nb\r\n\r\n", "c"}}, "a quoted cell keeps its line ends"},
         {"\"a\"\r\n\"b\"", ',', {{"a"}, {"b"}}, "a quote at the end of a row"},
-        {"a\tb,c\n", '\t', {{"a", "b,c"}}, "tabs between; the comma is none"},
+        {"a\tb,c\n", '\t', {{"a", "b,c"}}, "tabs between; the comma is not a delimiter"},
         {"a;\"b;c\";1,5\n", ';', {{"a", "b;c", "1,5"}}, "semicolons between"},
         {"a b\n", ' ', {{"a", "b"}}, "blanks between"},
         {"Gr\xC3\xB6\xC3\x9F"
@@ -82,7 +82,7 @@ TEST(CsvReader, ReadsRowsAndCells)
            "e",
            "\xE6\xB8\xAC", "\xF0\x9D\x84\x9E"}},
          "UTF-8 of two, three and four bytes"},
-        {"a\n\n\n\r\n", ',', {{"a"}}, "blank lines at the end are no rows"},
+        {"a\n\n\n\r\n", ',', {{"a"}}, "blank lines at the end are not rows"},
         {"a,b\n\n1,2", ',', {{"a", "b"}, {""}, {"1", "2"}}, "a blank line inside is a row of one empty cell"},
         {"\n\na", ',', {{""}, {""}, {"a"}}, "blank lines at the beginning"},
     };
@@ -109,9 +109,9 @@ TEST(CsvReader, EveryMistakeHasItsPlace)
         {"a,b\n1,2\"3"sv, "2:4", "quote", "in the second row"},
         {"a,b\n1,2\"\n"sv, "2:4", "quote", "at the end of a plain cell"},
         {"a, \"b\""sv, "1:4", "quote", "a blank in front of a quoted cell"},
-        {"\"a\"b"sv, "1:4", "delimiter", "a letter behind the closing quote"},
-        {"\"a\" ,b"sv, "1:4", "delimiter", "a blank behind the closing quote"},
-        {"\"a\";b"sv, "1:4", "delimiter", "another delimiter behind the closing quote"},
+        {"\"a\"b"sv, "1:4", "delimiter", "a letter after the closing quote"},
+        {"\"a\" ,b"sv, "1:4", "delimiter", "a blank after the closing quote"},
+        {"\"a\";b"sv, "1:4", "delimiter", "another delimiter after the closing quote"},
         {"\"abc"sv, "1:1", "no closing quote", "cut off in a quoted cell"},
         {"x,\"abc\ndef\n"sv, "1:3", "no closing quote", "where the quote was opened, not where the file ends"},
         {"\"a\"\""sv, "1:1", "no closing quote", "a doubled quote closes nothing"},
@@ -131,11 +131,11 @@ TEST(CsvReader, EveryMistakeHasItsPlace)
         {"\"a\nb\xFF\""sv, "2:2", "not UTF-8", "in the second line of a quoted cell"},
         {"\xEF\xBB\xBF"
          "a\xFF"sv,
-         "1:2", "not UTF-8", "behind a byte-order mark"},
+         "1:2", "not UTF-8", "after a byte-order mark"},
         {"\xFF\xFE"
          "N\0,\0E\0"sv,
          "1:4", "", "UTF-16"},
-        {"\"x\ny\",z\nq\""sv, "3:2", "quote", "the row behind one of two lines"},
+        {"\"x\ny\",z\nq\""sv, "3:2", "quote", "the row after one of two lines"},
         {"\"x\ny\",z\""sv, "2:5", "quote", "the second line of a row"},
         {"\"x\r\ny\",z\""sv, "2:5", "quote", "the second line of a row, with CR LF"},
         {"\xF0\x9D\x84\x9E\xE6\xB8\xAC,a\""sv, "1:5", "quote", "columns count characters, not bytes"},
@@ -151,7 +151,7 @@ TEST(CsvReader, EveryMistakeHasItsPlace)
         EXPECT_TRUE(reader.error()->text.contains(QString::fromUtf8(row.contains)))
             << row.reason << ": " << reader.error()->text.toStdString();
         EXPECT_EQ(reader.error()->file, file) << row.reason;
-        EXPECT_FALSE(reader.next()) << row.reason << ": nothing is read behind a mistake";
+        EXPECT_FALSE(reader.next()) << row.reason << ": nothing is read after a mistake";
     }
 }
 
@@ -162,7 +162,7 @@ TEST(CsvReader, RowsBeforeAMistakeAreRead)
     EXPECT_EQ(placeText(reader.error()), QStringLiteral("3:3"));
 }
 
-TEST(CsvReader, AnEndlessLineIsNoCsv)
+TEST(CsvReader, AnEndlessLineIsNotCsv)
 {
     constexpr std::size_t most = std::size_t(1) << 20;
     struct Row
@@ -189,7 +189,7 @@ TEST(CsvReader, AnEndlessLineIsNoCsv)
     }
 }
 
-TEST(CsvReader, ManyRowsAreNoEndlessLine)
+TEST(CsvReader, ManyRowsAreNotAnEndlessLine)
 {
     std::string bytes;
     for (int i = 0; i < 400000; ++i) {
@@ -232,7 +232,7 @@ TEST(CsvReader, CountsLinesAndGoesBack)
     }
 }
 
-TEST(CsvReader, GoesBackBehindAMistake)
+TEST(CsvReader, GoesBackAfterAMistake)
 {
     CsvReader reader(file, "a\nb\"\n", ',');
     ASSERT_TRUE(reader.next());

@@ -37,7 +37,7 @@ TEST(FileBytesPosix, WhatIsCutOffReadsAsZerosAndIsSaid)
         {0, "nothing is left"},
         {100, "within the first page"},
         {1'000'000, "in the middle"},
-        {2'100'000, "within the last page, which is no fault to the system"},
+        {2'100'000, "within the last page, which the system does not report"},
     };
     for (const Row &row : rows) {
         const JobFolder folder;
@@ -177,7 +177,7 @@ private:
     int before_;
 };
 
-TEST(FileBytesPosix, StandardInputIsReadFromWhereItStands)
+TEST(FileBytesPosix, StandardInputIsReadFromWhereItIs)
 {
     for (const qsizetype size : {qsizetype(0), qsizetype(100), qsizetype(3'000'000)}) {
         for (const off_t start : {off_t(0), off_t(7)}) {

@@ -28,7 +28,7 @@ QString unitOf(int type)
     }
 }
 
-TEST(LandXmlDocumented, AllVariablesStandInTheDocument)
+TEST(LandXmlDocumented, AllVariablesAreInTheDocument)
 {
     QFile file(QStringLiteral(KAREPORT_TEST_DIR "/../docs/landxml-lists.md"));
     ASSERT_TRUE(file.open(QIODevice::ReadOnly));

@@ -142,7 +142,8 @@ TEST(LandXmlElements, IrregularLinesAreTheirPieces)
                                       "5</PntList2D></IrregularLine>")),
                      queryOf(Kind::Elements),
                      {QStringLiteral("Type"), QStringLiteral("Length"), QStringLiteral("EndBearing")});
-    EXPECT_EQ(file.rows(3), QStringList(u"IrregularLine|20.000|1.571"_qs)) << "points that stand twice make no line";
+    EXPECT_EQ(file.rows(3), QStringList(u"IrregularLine|20.000|1.571"_qs))
+        << "points that are there twice make no line";
 }
 
 TEST(LandXmlElements, WhatDiffersFromTheGeometryIsNotedWithBothValues)
@@ -218,7 +219,7 @@ TEST(LandXmlElements, WithoutGeometryAreListedAndSaid)
     };
     const Row rows[] = {
         {"<Spiral length='10' rot='cw' spiType='revBloss' radiusStart='INF' radiusEnd='50'>" + ends + "</Spiral>",
-         "not supported: a transition of the form \"revBloss\"", "a form that nobody has written down"},
+         "not supported: a transition of the form \"revBloss\"", "a form without a description"},
         {"<Spiral length='10' rot='cw' spiType='clothoid' radiusStart='INF'>" + ends + "</Spiral>", "radiusEnd",
          "a radius that is missing"},
         {"<Spiral length='10' rot='cw' spiType='clothoid' radiusStart='INF' radiusEnd='0'>" + ends + "</Spiral>",
@@ -234,7 +235,7 @@ TEST(LandXmlElements, WithoutGeometryAreListedAndSaid)
         {"<Spiral length='10' rot='cw' spiType='cubicParabola' radiusStart='10' radiusEnd='5'>" + ends + "</Spiral>",
          "curved at both ends", "a form that begins at a tangent"},
         {"<Spiral length='100' rot='cw' spiType='cubicParabola' radiusStart='INF' radiusEnd='5'>" + ends + "</Spiral>",
-         "45 degrees", "a form that stands over its tangent"},
+         "45 degrees", "a form that is given over its tangent"},
         {"<Curve rot='cw'>" + ends + "</Curve>", "Center", "no centre and no radius"},
         {"<Curve rot='cw' radius='2'>" + ends + "</Curve>", "does not reach", "a radius that is too short"},
         {"<Curve radius='20'>" + ends + "</Curve>", "rot", "no side"},
@@ -272,7 +273,7 @@ TEST(LandXmlElements, OfOtherKindsKeepTheirPlaceAndHaveNoGeometry)
                       QStringLiteral("StartRadius")});
     EXPECT_EQ(file.rows(0),
               QStringList({u"1|Line|-|0|10|10|inf"_qs, u"2|Chain|-|10|-|-|-"_qs, u"3|Line|-|-|-|10|inf"_qs}))
-        << "nobody knows where the third one begins";
+        << "it is not known where the third one begins";
     EXPECT_EQ(file.notes(), QStringList(u"6:1: not supported: an element \"Chain\" of an alignment or a border"_qs));
 
     LandXmlFile lengths(content, queryOf(Kind::Alignments), {QStringLiteral("Length"), QStringLiteral("EndStation")});
@@ -281,7 +282,7 @@ TEST(LandXmlElements, OfOtherKindsKeepTheirPlaceAndHaveNoGeometry)
     EXPECT_EQ(places.rows(), QStringList());
     EXPECT_EQ(placeText(places.list->error()), u"6:1"_qs);
     LandXmlFile feature(fileOf(alignment(line + "<Feature/>")), queryOf(Kind::Elements), {QStringLiteral("Type")});
-    EXPECT_EQ(feature.rows(), QStringList(u"Line"_qs)) << "what says more of an element is none";
+    EXPECT_EQ(feature.rows(), QStringList(u"Line"_qs)) << "what says more of an element is not one itself";
     EXPECT_EQ(feature.notes(), QStringList(u"Feature: 1 in the file, which no list reads"_qs));
 }
 
@@ -299,10 +300,10 @@ TEST(LandXmlElements, TheirPointsMayBeReferred)
     LandXmlFile file(fileOf(alignment("<Line><Start pntRef='a'/><End pntRef='b'/></Line>") +
                             "<CgPoints><CgPoint name='a'>1 2</CgPoint><CgPoint name='b'>1 7</CgPoint></CgPoints>"),
                      queryOf(Kind::Elements), {QStringLiteral("StartNorthing"), QStringLiteral("EndEasting")});
-    EXPECT_EQ(file.rows(0), QStringList(u"1|7"_qs)) << "points that stand after the alignment";
+    EXPECT_EQ(file.rows(0), QStringList(u"1|7"_qs)) << "points that come after the alignment";
 }
 
-TEST(LandXmlElements, AttributesThatAreNoNumbersAreErrors)
+TEST(LandXmlElements, AttributesThatAreNotNumbersAreErrors)
 {
     for (const char *attribute : {"length='1,5'", "staStart='x'", "length='nan'", "length='INF'", "staStart='INF'"}) {
         LandXmlFile file(

@@ -181,7 +181,7 @@ TEST(LandXmlHostile, PointsAreNotProjectedOntoCoils)
     const QByteArray ramp =
         "<Curve rot='cw' length='2000'><Start>0 0</Start><Center>0 50</Center><End>0.001 0</End></Curve>";
     LandXmlFile turns(fileOf(points + alignment(ramp)), queryOf(Kind::OffsetsOf), {QStringLiteral("Offset")});
-    EXPECT_EQ(turns.rows().size(), 20000) << "a ramp of a few turns is no coil";
+    EXPECT_EQ(turns.rows().size(), 20000) << "a ramp of a few turns is not a coil";
 }
 
 } // namespace

@@ -50,7 +50,7 @@ TEST(LandXmlOffsets, ACentreIsSaid)
         fileOf(points("1100 600") + alignment("<Curve rot='cw'><Start>1100 500</Start><Center>1100 600</Center>"
                                               "<End>1200 600</End></Curve>")),
         queryOf(Kind::OffsetsOf), {QStringLiteral("Station"), QStringLiteral("Place"), QStringLiteral("Distance")});
-    EXPECT_EQ(file.rows(0), QStringList(u"-|at a centre|100"_qs)) << "points may stand before the alignment";
+    EXPECT_EQ(file.rows(0), QStringList(u"-|at a centre|100"_qs)) << "points may come before the alignment";
 }
 
 TEST(LandXmlOffsets, OfAGroupAndOfAnAlignmentAreListedAlone)

@@ -64,7 +64,8 @@ TEST(LandXmlParcels, MayBePartsOfOthers)
     EXPECT_EQ(LandXmlFile(content, queryOf(Kind::Parcels), variables).rows(),
               QStringList({u"block|-"_qs, u"1|block"_qs, u"2|block"_qs, u"other|-"_qs}));
     EXPECT_EQ(LandXmlFile(content, queryOf(Kind::Parcels, "2"), variables).rows(), QStringList(u"2|block"_qs));
-    EXPECT_EQ(LandXmlFile(content, queryOf(Kind::Elements)).rows().size(), 3) << "their sides are no alignment's";
+    EXPECT_EQ(LandXmlFile(content, queryOf(Kind::Elements)).rows().size(), 3)
+        << "their sides do not belong to an alignment";
 }
 
 TEST(LandXmlParcels, WhatDoesNotFitIsNoted)

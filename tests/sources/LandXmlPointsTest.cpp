@@ -75,7 +75,7 @@ TEST(LandXmlPoints, AfterAGroupInAGroupBelongToTheOuterOne)
     EXPECT_EQ(file.rows(), QStringList({u"1|a"_qs, u"2|b"_qs, u"3|a"_qs}));
 }
 
-TEST(LandXmlPoints, TheNameOfASurfaceIsNoGroup)
+TEST(LandXmlPoints, TheNameOfASurfaceIsNotAGroup)
 {
     const QByteArray content =
         fileOf("<CgPoints name='a'><CgPoint name='1'>1 1</CgPoint></CgPoints><Surfaces><Surface name='s'><Definition>"
@@ -131,7 +131,7 @@ TEST(LandXmlPoints, MayReferToOthers)
     }
 }
 
-TEST(LandXmlPoints, NamesThatStandTwiceAreNoted)
+TEST(LandXmlPoints, NamesThatOccurTwiceAreNoted)
 {
     LandXmlFile file(
         fileOf("<CgPoints><CgPoint name='1'>1 1</CgPoint>\n<CgPoint name='1'>2 2</CgPoint><CgPoint>3 3</CgPoint>"

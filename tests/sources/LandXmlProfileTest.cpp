@@ -82,7 +82,7 @@ TEST(LandXmlProfile, AGradeLineWithoutHeightsIsListedAsStoredAndSaid)
     }
 }
 
-TEST(LandXmlProfile, APointThatStandsTwiceIsOneAndACurveOfNoLengthIsNone)
+TEST(LandXmlProfile, APointThatOccursTwiceIsOneAndACurveOfNoLengthIsNotOne)
 {
     LandXmlFile file(gradeLine("<PVI>0 1</PVI><ParaCurve length='0'>10 2</ParaCurve><PVI>10 2</PVI><PVI>20 1</PVI>"),
                      queryOf(Kind::Profile),
@@ -117,7 +117,7 @@ TEST(LandXmlProfile, StationsAreNamedByTheEquations)
     EXPECT_EQ(file.rows(0), QStringList({u"0"_qs, u"1050"_qs}));
 }
 
-TEST(LandXmlProfile, PointsThatAreNoPairsAreErrors)
+TEST(LandXmlProfile, PointsThatAreNotPairsAreErrors)
 {
     for (const char *points : {"<PVI>0</PVI>", "<PVI>0 1 2</PVI>", "<PVI>x 1</PVI>", "<PVI/>"}) {
         LandXmlFile file(gradeLine(points), queryOf(Kind::Profile));

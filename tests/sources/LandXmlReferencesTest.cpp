@@ -107,7 +107,7 @@ TEST(LandXmlReferences, ReadingThePointsCanBeStopped)
                      });
     EXPECT_EQ(file.rows(), QStringList());
     EXPECT_TRUE(isSecondPass) << "the points are read after the alignment";
-    EXPECT_FALSE(file.list->error()) << "to stop is no mistake";
+    EXPECT_FALSE(file.list->error()) << "to stop is not a mistake";
 }
 
 } // namespace

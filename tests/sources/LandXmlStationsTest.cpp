@@ -213,7 +213,7 @@ TEST(LandXmlStations, EquationsThatDoNotFitAreErrors)
     EXPECT_TRUE(differs.notes().value(0).contains(u"staBack is 51.0000 in the file, but 50.0000 by its geometry"));
 }
 
-TEST(LandXmlStations, AnIntervalThatNobodyMeansIsAnError)
+TEST(LandXmlStations, AnIntervalWithoutASenseIsAnError)
 {
     LandXmlQuery query = queryOf(Kind::Stations);
     query.interval = 1e-9;

@@ -69,7 +69,7 @@ TEST(LandXmlUnits, AnotherUnitOfHeightsIsTold)
         {"<Metric linearUnit='meter' elevationUnit='meter'/>", "", "the same"},
         {"<Imperial linearUnit='USSurveyFoot' elevationUnit='feet'/>", "", "the feet differ by less than the digits"},
         {"<Imperial linearUnit='foot' elevationUnit='meter'/>", "meter", "heights in metres"},
-        {"<Metric linearUnit='meter' elevationUnit='fathom'/>", "fathom", "nobody knows"},
+        {"<Metric linearUnit='meter' elevationUnit='fathom'/>", "fathom", "a unit that is not known"},
     };
     for (const Row &row : rows) {
         const auto header = headerOf(withUnits(row.units));
@@ -115,7 +115,7 @@ TEST(LandXmlUnits, WithoutThemNothingIsRead)
         const char *reason;
     };
     const Row rows[] = {
-        {withUnits("<Metric linearUnit='cubit'/>"), "linearUnit=\"cubit\"", "a length that nobody knows"},
+        {withUnits("<Metric linearUnit='cubit'/>"), "linearUnit=\"cubit\"", "a length that is not known"},
         {withUnits("<Metric/>"), "linearUnit=\"\"", "no length"},
         {withUnits("<Metric linearUnit='meter' areaUnit='barn'/>"), "areaUnit=\"barn\"", "an area"},
         {withUnits("<Metric linearUnit='meter' angularUnit='mils'/>"), "angularUnit=\"mils\"", "an angle"},

@@ -58,7 +58,7 @@ TEST(ParseNumber, ReadsWhatIsANumber)
     }
 }
 
-TEST(ParseNumber, RefusesWhatIsNone)
+TEST(ParseNumber, RefusesWhatIsNotOne)
 {
     struct Row
     {
@@ -84,7 +84,7 @@ TEST(ParseNumber, RefusesWhatIsNone)
         {"0x10", "no other base"},
         {"12abc", "letters after it"},
         {"12 m", "a unit after it"},
-        {"12+345.678", "a station is no plain number"},
+        {"12+345.678", "a station is not a plain number"},
         {"nan(1)", "what only C writes"},
         {"infinit", "half a word"},
         {"1e400", "out of range"},
@@ -166,7 +166,7 @@ TEST(ParseSexagesimal, ReadsEverySpelling)
     }
 }
 
-TEST(ParseSexagesimal, RefusesWhatIsNone)
+TEST(ParseSexagesimal, RefusesWhatIsNotOne)
 {
     struct Row
     {

@@ -45,7 +45,7 @@ TEST(PointGeometry, ReadsPointsOfEveryKind)
             };
             EXPECT_EQ(point(none, none), "1.5 -2 - 25832");
             EXPECT_EQ(point(3, none), "1.5 -2 3 25832");
-            EXPECT_EQ(point(none, 4), "1.5 -2 - 25832") << "a measure is no height";
+            EXPECT_EQ(point(none, 4), "1.5 -2 - 25832") << "a measure is not a height";
             EXPECT_EQ(point(3, 4), "1.5 -2 3 25832");
         }
         EXPECT_EQ(textOf(parseWkbPoint(viewOf(geo::wkbPoint(1, 2, 3, none, isLittle)))), "1 2 3 0");
@@ -68,7 +68,7 @@ TEST(PointGeometry, ReadsExtendedBinaryInDigits)
     EXPECT_EQ(textOf(parseHexPoint("010300000001000000" + std::string(6400, '0'))), "a polygon");
 }
 
-TEST(PointGeometry, SaysWhatStandsThereInstead)
+TEST(PointGeometry, SaysWhatIsThereInstead)
 {
     struct Row
     {

@@ -53,7 +53,7 @@ TEST_F(PostgresServer, ReadsWhatAQueryAnswers)
         "CREATE TABLE points (number text, northing float8, easting numeric(12, 3), code text, count int, flag bool);"
         "INSERT INTO points VALUES ('BM-1', 100.5, 200, 'x', 3, true), ('2', -1e3, NULL, NULL, NULL, false)");
     const char *all = "number=BM-1 northing=100.5 easting=200 count=3 flag=yes\nnumber=2 northing=-1000 flag=no";
-    EXPECT_EQ(rowsOf(query("SELECT * FROM points")), all) << "NULL is no value, and what nobody knows is passed over";
+    EXPECT_EQ(rowsOf(query("SELECT * FROM points")), all) << "NULL means no value, and what is not known is skipped";
     EXPECT_EQ(rowsOf(query("TABLE points;")), all) << "in short";
     EXPECT_EQ(rowsOf(query("WITH p AS (SELECT * FROM points) SELECT number AS \"Number\" FROM p ORDER BY 1 DESC")),
               "number=BM-1\nnumber=2");
@@ -98,7 +98,7 @@ TEST_F(PostgresServer, ValuesFitTheTypesOfTheirVariables)
         {"'Gr\xC3\xB6\xC3\x9F"
          "e'::text AS description",
          "description=Größe", "UTF-8"},
-        {"''::text AS northing", "", "an empty text is no value"},
+        {"''::text AS northing", "", "an empty text means no value"},
         {"true AS flag", "flag=yes", "a boolean"},
         {"'12+345.678'::text AS station, '3.2 L'::text AS offset", "station=12345.678 offset=-3.2", "notation"},
         {"'N45-30-36E'::text AS bearing", "bearing=45.51", "notation"},
@@ -304,7 +304,7 @@ TEST_F(PostgresServer, AQueryThatRunsLongCanBeStopped)
         }
         EXPECT_EQ(list.GetAt(0), nullptr);
         EXPECT_LE(calls, mostCalls + 1) << "it is not asked much longer";
-        EXPECT_FALSE(list.error()) << "to be stopped is no mistake of the data";
+        EXPECT_FALSE(list.error()) << "to be stopped is not a mistake of the data";
     }
     EXPECT_EQ(
         rowsOf(query(

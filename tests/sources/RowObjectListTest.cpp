@@ -188,7 +188,7 @@ TEST(RowObjectList, ARowThatIsLongInComingCanBeStopped)
         EXPECT_EQ(all.list.GetAt(0), nullptr) << isSorted;
         EXPECT_EQ(calls, 3) << isSorted << ": it is asked while nothing comes";
         EXPECT_TRUE(all.rows->isStopped) << isSorted;
-        EXPECT_FALSE(all.list.error()) << isSorted << ": to be stopped is no mistake of the data";
+        EXPECT_FALSE(all.list.error()) << isSorted << ": to be stopped is not a mistake of the data";
     }
 }
 

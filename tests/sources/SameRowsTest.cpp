@@ -59,7 +59,7 @@ TEST(SameRows, ComeFromEveryDialectAndSource)
     add("UTF-16", [](CsvDialect &d) { d.encoding = TextEncoding::Utf16; });
     add("an order", [](CsvDialect &d) { d.hasHeader = false, d.order = QStringLiteral("PNEZD"); });
     add("an order after a header", [](CsvDialect &d) { d.order = QStringLiteral("pnezd"); });
-    add("lines passed over", [](CsvDialect &d) { d.skip = 3, d.comment = '#', d.passesBlankLines = true; });
+    add("lines skipped", [](CsvDialect &d) { d.skip = 3, d.comment = '#', d.passesBlankLines = true; });
     add("columns by number", [](CsvDialect &d) {
         d.hasHeader = false;
         d.columns = {{"Number", 1}, {"Northing", 2}, {"Easting", 3}, {"Elevation", 4}, {"Description", 5}};

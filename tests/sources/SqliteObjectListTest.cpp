@@ -80,7 +80,7 @@ TEST(SqliteObjectList, ReadsTablesViewsAndQueries)
         const char *reason;
     };
     const Row rows[] = {
-        {database.table("points"), all, "a table; NULL is no value, and what nobody knows is passed over"},
+        {database.table("points"), all, "a table; NULL means no value, and what is not known is skipped"},
         {database.table("POINTS"), all, "in any case"},
         {database.table("high"), "number=BM-1 elevation=100.5\nnumber=2 elevation=-1000", "a view"},
         {database.table("odd \"name"), "number=7", "a name with a quote"},
@@ -132,7 +132,7 @@ TEST(SqliteObjectList, AGeoPackageThatDoesNotDescribeItselfIsSaid)
                              "ALTER TABLE gpkg_spatial_ref_sys RENAME COLUMN organization TO other";
     const Database unsystematic(geo::packageSql() + layer);
     EXPECT_EQ(joined(rowsOf(unsystematic.table("t", {{"Northing", QStringLiteral("@y")}}))), "number=1 northing=2")
-        << "nobody asks for the reference system";
+        << "the reference system is not asked for";
     EXPECT_EQ(joined(rowsOf(unsystematic.table("t", {{"Description", QStringLiteral("@srs")}}))),
               "error the database does not answer the query: no such column: organization");
 }
@@ -164,7 +164,7 @@ TEST(SqliteObjectList, ValuesFitTheTypesOfTheirVariables)
         {"Northing", "1.25", "northing=1.25", "a number"},
         {"Northing", "2", "northing=2", "a whole number"},
         {"Northing", "' 2.5 '", "northing=2.5", "a text that is one"},
-        {"Northing", "''", "", "an empty text is no value"},
+        {"Northing", "''", "", "an empty text means no value"},
         {"Northing", "9e999", "northing=inf", "infinite"},
         {"Northing", "'abc'",
          "error row 2: the value \"abc\" of the column \"Northing\" does not fit: a number was expected", "a text"},
@@ -175,12 +175,12 @@ TEST(SqliteObjectList, ValuesFitTheTypesOfTheirVariables)
         {"Number", "2.5", "number=2.5", "with decimals"},
         {"Number", "x'41'",
          "error row 2: the value \"1 bytes\" of the column \"Number\" does not fit: a text was expected",
-         "bytes are no text"},
+         "bytes are not a text"},
         {"Description", "'Größe 𝄞'", "description=Größe 𝄞", "UTF-8"},
         {"Description", "CAST(x'FF41' AS TEXT)",
          "error row 2: the value \"\xEF\xBF\xBD"
          "A\" of the column \"Description\" does not fit: a text was expected",
-         "bytes that are no UTF-8"},
+         "bytes that are not UTF-8"},
         {"Description", "CAST(x'410042' AS TEXT)", "error row 2: the value", "a zero byte"},
         {"Count", "5", "count=5", "a whole number"},
         {"Count", "5.0", "count=5", "that is held as another"},
@@ -246,7 +246,7 @@ TEST(SqliteObjectList, SaysWhatIsWrong)
         {database.query("SELECT Nought FROM points"), "the database does not answer the query: no such column: Nought",
          "a misspelt column"},
         {database.query("SELECT \"Nought\" AS Number FROM points"),
-         "the database does not answer the query: no such column: Nought", "in quotes: it is no text"},
+         "the database does not answer the query: no such column: Nought", "in quotes: it is not a text"},
         {database.query("SELEC 1"), "the database does not answer the query: near \"SELEC\": syntax error", "no SQL"},
         {database.query(""), "the query is not a single SELECT", "nothing"},
         {database.query("-- nothing"), "the query is not a single SELECT", "a comment"},
@@ -279,7 +279,7 @@ TEST(SqliteObjectList, SaysWhatIsWrong)
     EXPECT_EQ(chosen.reader().wrongChoice()->choice.toStdString(), "Elev");
 }
 
-TEST(SqliteObjectList, FilesThatAreNoDatabase)
+TEST(SqliteObjectList, FilesThatAreNotADatabase)
 {
     const JobFolder folder;
     struct Row
@@ -340,7 +340,7 @@ TEST(SqliteObjectList, WhatIsNotYetMovedIntoTheFileCounts)
     EXPECT_EQ(rowsOf(database.table("points")).last().toStdString(), "number=new");
     SqliteObjectList list(database.table("points"), survey::variables(), {});
     EXPECT_NE(list.GetAt(0), nullptr);
-    // Somebody goes on writing meanwhile: the state that was begun with stays.
+    // Another program goes on writing meanwhile: the state that was begun with stays.
     ASSERT_EQ(sqlite3_exec(writer, "DELETE FROM points; PRAGMA wal_checkpoint(PASSIVE)", nullptr, nullptr, nullptr),
               SQLITE_OK);
     EXPECT_EQ(survey::rowsOf(list).size(), 3) << "going back finds the same rows";
@@ -413,7 +413,7 @@ TEST(SqliteObjectList, AQueryThatRunsLongCanBeStopped)
         }
         EXPECT_EQ(list.GetAt(0), nullptr);
         EXPECT_EQ(calls, 3);
-        EXPECT_FALSE(list.error()) << "to be stopped is no mistake of the data";
+        EXPECT_FALSE(list.error()) << "to be stopped is not a mistake of the data";
     }
 }
 
@@ -485,14 +485,14 @@ TEST(SqliteObjectList, PointsOfAGeoPackageHaveCoordinates)
               "number=A description=ETRS89 / UTM zone 32N\nnumber=B\nnumber=C\n"
               "number=D description=ETRS89 / UTM zone 32N");
     EXPECT_EQ(joined(rowsOf(database.table("marks"))), "number=A\nnumber=B\nnumber=C\nnumber=D")
-        << "nobody asks for the geometry";
+        << "the geometry is not asked for";
     const SqliteObjectList list(database.table("marks"), survey::variables(), {});
     const auto &columns = list.reader().columns();
     ASSERT_EQ(columns.size(), 8U);
-    EXPECT_TRUE(columns[3].isOffered && !columns[0].isOffered) << "nobody misses what is only offered";
+    EXPECT_TRUE(columns[3].isOffered && !columns[0].isOffered) << "what is only offered is not missed";
 }
 
-TEST(SqliteObjectList, WhatIsNoPointIsSaid)
+TEST(SqliteObjectList, WhatIsNotAPointIsSaid)
 {
     const Database database(geo::packageSql() +
                             "CREATE TABLE lines (fid INTEGER PRIMARY KEY, geom BLOB, second BLOB, Number);"

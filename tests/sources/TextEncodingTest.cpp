@@ -80,7 +80,7 @@ TEST(TextEncoding, EveryEncodingReads)
         {TextEncoding::Latin1, "Number,Count\n\xF6,x\n",
          "error 2:3 the cell \"x\" of the column \"Count\" does not fit: a whole number was expected",
          "places count characters"},
-        {TextEncoding::Utf8, "Number\n\xF6\n", "error 2:1 the file is not UTF-8", "Latin-1 that nobody told of"},
+        {TextEncoding::Utf8, "Number\n\xF6\n", "error 2:1 the file is not UTF-8", "Latin-1 that was not announced"},
     };
     for (const Row &row : rows) {
         CsvDialect dialect;

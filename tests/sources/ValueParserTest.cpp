@@ -40,74 +40,76 @@ QString stored(const ValueParser &parser, std::string_view text)
     }
 }
 
+/// A text, and what a variable of a type has of it.
+struct Stored
+{
+    int type;
+    const char *text;
+    const char *expected;
+    const char *reason;
+};
+constexpr Stored storedTexts[] = {
+    {VARIABLE_INTEGER, "12", "4 12", "kind 4"},
+    {VARIABLE_INTEGER, "+12", "4 12", "a plus"},
+    {VARIABLE_INTEGER, " -12 ", "4 -12", "blanks around it"},
+    {VARIABLE_INTEGER, "2147483647", "4 2147483647", "the largest"},
+    {VARIABLE_INTEGER, "-2147483648", "4 -2147483648", "the smallest"},
+    {VARIABLE_INTEGER, "2147483648", "misfit", "one too large"},
+    {VARIABLE_INTEGER, "-2147483649", "misfit", "one too small"},
+    {VARIABLE_INTEGER, "1.5", "misfit", "not whole"},
+    {VARIABLE_INTEGER, "INF", "misfit", "not whole"},
+    {VARIABLE_INTEGER, "0x1F", "misfit", "no other base"},
+    {VARIABLE_INTEGER, "12a", "misfit", "letters"},
+    {VARIABLE_TEXT, "ab", "16 ab", "kind 16"},
+    {VARIABLE_TEXT, " ab ", "16  ab ", "blanks are part of a text"},
+    {VARIABLE_TEXT, "12", "16 12", "digits are a text"},
+    {VARIABLE_TEXT,
+     "Gr\xC3\xB6\xC3\x9F"
+     "e \xF0\x9D\x84\x9E",
+     "16 Gr\xC3\xB6\xC3\x9F"
+     "e \xF0\x9D\x84\x9E",
+     "UTF-8"},
+    {VARIABLE_NAME, "ab", "16 ab", "kind 16"},
+    {VARIABLE_NUMBER, "BM-3", "32 BM-3", "kind 32"},
+    {VARIABLE_NUMBER, "007", "32 007", "a point's number keeps its zeros"},
+    {VARIABLE_DOUBLE, "2.5", "8 2.5", "as given"},
+    {VARIABLE_DOUBLE, "INF", "8 inf", "infinite is a number"},
+    {VARIABLE_DOUBLE, "NAN", "8 nan", "not-a-number is a number"},
+    {VARIABLE_DOUBLE, "two", "misfit", "a word"},
+    {VARIABLE_COORDINATE, "2.5", "8 2.5", "metres"},
+    {VARIABLE_LENGTH, "2.5", "8 2.5", "metres"},
+    {VARIABLE_LENGTH, "1+234", "misfit", "a plus inside is for stations only"},
+    {VARIABLE_DISTANCE, "2.5", "8 2.5", "metres"},
+    {VARIABLE_ELEVATION, "-INF", "8 -inf", "infinite below 0"},
+    {VARIABLE_OFFSET, "-2.5", "8 -2.5", "metres"},
+    {VARIABLE_AREA, "2.5", "8 2.5", "square metres"},
+    {VARIABLE_THICKNESS, "-1", "8 -1", "as given"},
+    {VARIABLE_PLAIN, "2.5", "8 2.5", "as given"},
+    {12, "2.5", "8 2.5", "every other type is a number as given"},
+    {-1, "2.5", "8 2.5", "every other type is a number as given"},
+    {VARIABLE_STATION, "12+345.678", "8 12345.678", "the plus is dropped"},
+    {VARIABLE_STATION, "123+45.678", "8 12345.678", "wherever it is"},
+    {VARIABLE_STATION, "0+000", "8 0", "zero"},
+    {VARIABLE_STATION, "-1+234.5", "8 -1234.5", "negative"},
+    {VARIABLE_STATION, "+1+234.5", "8 1234.5", "a plus in front is a sign"},
+    {VARIABLE_STATION, "12345.5", "8 12345.5", "without a plus"},
+    {VARIABLE_STATION, "1e+3", "8 1000", "the plus of an exponent"},
+    {VARIABLE_STATION, "INF", "8 inf", "infinite"},
+    {VARIABLE_STATION, "1+2+3", "misfit", "two pluses"},
+    {VARIABLE_STATION, "1+5.0", "misfit", "1+005.0 or 1+05.0 may be meant: 15.0 is neither"},
+    {VARIABLE_STATION, "1+0456", "misfit", "no station has four digits there"},
+    {VARIABLE_STATION, "12+", "misfit", "nothing after the plus"},
+    {VARIABLE_STATION, "+", "misfit", "a plus alone"},
+    {VARIABLE_STATION, "12+-345", "misfit", "a sign after the plus"},
+    {VARIABLE_STATION, "12++345", "misfit", "two pluses"},
+    {VARIABLE_STATION, "12-345", "misfit", "a minus is not a plus"},
+};
+
 TEST(ValueParser, StoresByTheTypeOfTheVariable)
 {
-    struct Row
-    {
-        int type;
-        const char *text;
-        const char *expected;
-        const char *reason;
-    };
-    constexpr Row rows[] = {
-        {VARIABLE_INTEGER, "12", "4 12", "kind 4"},
-        {VARIABLE_INTEGER, "+12", "4 12", "a plus"},
-        {VARIABLE_INTEGER, " -12 ", "4 -12", "blanks around it"},
-        {VARIABLE_INTEGER, "2147483647", "4 2147483647", "the largest"},
-        {VARIABLE_INTEGER, "-2147483648", "4 -2147483648", "the smallest"},
-        {VARIABLE_INTEGER, "2147483648", "misfit", "one too large"},
-        {VARIABLE_INTEGER, "-2147483649", "misfit", "one too small"},
-        {VARIABLE_INTEGER, "1.5", "misfit", "not whole"},
-        {VARIABLE_INTEGER, "INF", "misfit", "not whole"},
-        {VARIABLE_INTEGER, "0x1F", "misfit", "no other base"},
-        {VARIABLE_INTEGER, "12a", "misfit", "letters"},
-        {VARIABLE_TEXT, "ab", "16 ab", "kind 16"},
-        {VARIABLE_TEXT, " ab ", "16  ab ", "blanks are part of a text"},
-        {VARIABLE_TEXT, "12", "16 12", "digits are a text"},
-        {VARIABLE_TEXT,
-         "Gr\xC3\xB6\xC3\x9F"
-         "e \xF0\x9D\x84\x9E",
-         "16 Gr\xC3\xB6\xC3\x9F"
-         "e \xF0\x9D\x84\x9E",
-         "UTF-8"},
-        {VARIABLE_NAME, "ab", "16 ab", "kind 16"},
-        {VARIABLE_NUMBER, "BM-3", "32 BM-3", "kind 32"},
-        {VARIABLE_NUMBER, "007", "32 007", "a point's number keeps its zeros"},
-        {VARIABLE_DOUBLE, "2.5", "8 2.5", "as given"},
-        {VARIABLE_DOUBLE, "INF", "8 inf", "infinite is a number"},
-        {VARIABLE_DOUBLE, "NAN", "8 nan", "not-a-number is a number"},
-        {VARIABLE_DOUBLE, "two", "misfit", "a word"},
-        {VARIABLE_COORDINATE, "2.5", "8 2.5", "metres"},
-        {VARIABLE_LENGTH, "2.5", "8 2.5", "metres"},
-        {VARIABLE_LENGTH, "1+234", "misfit", "a plus inside is for stations only"},
-        {VARIABLE_DISTANCE, "2.5", "8 2.5", "metres"},
-        {VARIABLE_ELEVATION, "-INF", "8 -inf", "infinite below 0"},
-        {VARIABLE_OFFSET, "-2.5", "8 -2.5", "metres"},
-        {VARIABLE_AREA, "2.5", "8 2.5", "square metres"},
-        {VARIABLE_THICKNESS, "-1", "8 -1", "as given"},
-        {VARIABLE_PLAIN, "2.5", "8 2.5", "as given"},
-        {12, "2.5", "8 2.5", "every other type is a number as given"},
-        {-1, "2.5", "8 2.5", "every other type is a number as given"},
-        {VARIABLE_STATION, "12+345.678", "8 12345.678", "the plus is dropped"},
-        {VARIABLE_STATION, "123+45.678", "8 12345.678", "wherever it stands"},
-        {VARIABLE_STATION, "0+000", "8 0", "zero"},
-        {VARIABLE_STATION, "-1+234.5", "8 -1234.5", "negative"},
-        {VARIABLE_STATION, "+1+234.5", "8 1234.5", "a plus in front is a sign"},
-        {VARIABLE_STATION, "12345.5", "8 12345.5", "without a plus"},
-        {VARIABLE_STATION, "1e+3", "8 1000", "the plus of an exponent"},
-        {VARIABLE_STATION, "INF", "8 inf", "infinite"},
-        {VARIABLE_STATION, "1+2+3", "misfit", "two pluses"},
-        {VARIABLE_STATION, "1+5.0", "misfit", "1+005.0 or 1+05.0 may be meant: 15.0 is neither"},
-        {VARIABLE_STATION, "1+0456", "misfit", "no station has four digits there"},
-        {VARIABLE_STATION, "12+", "misfit", "nothing behind the plus"},
-        {VARIABLE_STATION, "+", "misfit", "a plus alone"},
-        {VARIABLE_STATION, "12+-345", "misfit", "a sign behind the plus"},
-        {VARIABLE_STATION, "12++345", "misfit", "two pluses"},
-        {VARIABLE_STATION, "12-345", "misfit", "a minus is no plus"},
-    };
-    for (const Row &row : rows) {
-        EXPECT_EQ(stored(ValueParser(row.type, id, DataUnits()), row.text), QString::fromUtf8(row.expected))
-            << "type " << row.type << ", " << row.text << ": " << row.reason;
+    for (const Stored &value : storedTexts) {
+        EXPECT_EQ(stored(ValueParser(value.type, id, DataUnits()), value.text), QString::fromUtf8(value.expected))
+            << "type " << value.type << ", " << value.text << ": " << value.reason;
     }
 }
 

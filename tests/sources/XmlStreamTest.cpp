@@ -82,7 +82,7 @@ TEST(XmlStream, TheVocabularyIsThatOfTheOutermostElementWhateverItsPrefixIs)
         {"<a xmlns='u' xmlns:x='v'><x:b><c/></x:b><b/></a>", "<a>{x:b}<b></></>",
          "what is in a foreign element is its own"},
         {"<a xmlns='u'><b xmlns='v'><c/></b><b/></a>", "<a>{b}<b></></>", "changed for an element, and back after it"},
-        {"<a xmlns='u'><skip xmlns='u'><c xmlns='v'/></skip><b/></a>", "<a><skip><b></></>", "in what is passed over"},
+        {"<a xmlns='u'><skip xmlns='u'><c xmlns='v'/></skip><b/></a>", "<a><skip><b></></>", "in what is skipped"},
         {"<a><x:b/></a>", "<a>{x:b}</>", "a prefix that is not declared"},
     };
     for (const Row &row : rows) {
@@ -143,7 +143,7 @@ TEST(XmlStream, EveryMistakeHasItsPlace)
         {"<!DOCTYPE a SYSTEM 'other.dtd'>\n<a>&x;</a>", "1:31", "\"other.dtd\"", "one that another file would declare"},
         {"<!DOCTYPE a PUBLIC 'x' 'other.dtd' [\n<!ATTLIST a b CDATA '1'>]><a/>", "1:36", "\"other.dtd\"",
          "a document type in another file, and more of it in this one"},
-        {"<a>\n&x;</a>", "2:1", "not well-formed XML", "one that nobody declares"},
+        {"<a>\n&x;</a>", "2:1", "not well-formed XML", "one that is not declared"},
     };
     for (const Row &row : rows) {
         const Read read(row.content);
@@ -180,7 +180,7 @@ TEST(XmlStream, FilesThatWouldTakeAllMemoryAreRefused)
     const Row rows[] = {
         {laughs + "]><a>&l11;</a>", "entity", "a billion laughs"},
         {"<a>" + QByteArray("<b>").repeated(1000000), "nested", "a million elements in each other"},
-        {"<a>" + QByteArray("<skip>").repeated(1000000), "nested", "in what is passed over"},
+        {"<a>" + QByteArray("<skip>").repeated(1000000), "nested", "in what is skipped"},
         {"<a x='" + QByteArray(20 << 20, 'x') + "'/>", "tag", "a value of twenty million characters"},
         {"<a " + QByteArray(20 << 20, ' ') + "/>", "tag", "a tag of blanks"},
         {"<a><!--" + QByteArray(20 << 20, '-'), "XML", "a comment that does not end"},
