@@ -83,7 +83,7 @@ std::vector<JobNote> unknownColumns(const SourceColumns &columns, const sXmlRepo
             ++more;
             continue;
         }
-        const QString sentence = Xlate("the column \"%1\" is no variable of the dictionary \"%2\"")
+        const QString sentence = Xlate("the column \"%1\" is not a variable of the dictionary \"%2\"")
                                      .arg(column.name, dictionary.DictionaryName);
         const QString question = didYouMean(column.name, names);
         const QString text = question.isEmpty() ? sentence : sentence + QStringLiteral(": ") + question;

@@ -134,7 +134,7 @@ CsvDialect readCsvDialect(const JsonNode &set)
         dialect.order = order.text();
         if (!namesOfOrder(dialect.order)) {
             order.fail(Xlate("an order of columns such as PNEZD was expected: each of the letters P, N, E, Z and D at "
-                             "most once, and - for a column that is passed over"));
+                             "most once, and - for a column that is skipped"));
         } else if (!dialect.names.isEmpty()) {
             order.fail(Xlate("the columns have names already: either an order or a list of columns was expected"));
         }

@@ -25,7 +25,7 @@ public:
     /// A piece of text, never empty, with the style it was written in. @return false when there is no memory for it: it is
     /// then not written at all
     virtual bool textWritten(QStringView text, int style) = 0;
-    /// A line end that is no part of a piece. @return false as above
+    /// A line end that is not part of a piece. @return false as above
     virtual bool lineEnded() = 0;
     /// A line, a heading or a page header was written.
     virtual void changed() = 0;

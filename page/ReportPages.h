@@ -16,7 +16,7 @@ bool isBlankLine(QStringView line);
 /// The pages of a text, in order: whatever shows, prints or saves pages asks here.
 ///
 /// A page begins at each recorded start that is at the beginning of a line. Text before the first of them, and a text
-/// without any, is cut every `linesPerPage` lines. What holds nothing but blank lines is no page at the end of the text or
+/// without any, is cut every `linesPerPage` lines. What holds nothing but blank lines is not a page at the end of the text or
 /// of the part that is cut by lines; a text of blank lines alone is one page, an empty text none.
 /// @param starts        in ascending order
 /// @param linesPerPage  below 1 counts as 1

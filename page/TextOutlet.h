@@ -17,7 +17,7 @@ public:
     TextOutlet(const TextOutlet &) = delete;
     TextOutlet &operator=(const TextOutlet &) = delete;
 
-    /// Takes what comes next in the text. @return false once something could not be taken; what comes then is passed over
+    /// Takes what comes next in the text. @return false once something could not be taken; what comes then is ignored
     virtual bool write(QStringView text) = 0;
     /// The same for characters up to U+00FF.
     virtual bool write(QLatin1StringView text) = 0;

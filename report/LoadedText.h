@@ -37,7 +37,7 @@ enum class TextLoading
 /// @param proceed  receives the bytes done; its false stops the work. May be empty
 TextLoading loadReportText(QByteArrayView bytes, LoadedText &loaded,
                            const std::function<bool(qint64 done)> &proceed = {});
-/// Reads bytes that are the text in UTF-8, with its own line ends. What is no UTF-8 reads as a sign for that.
+/// Reads bytes that are the text in UTF-8, with its own line ends. What is not UTF-8 is read as replacement characters.
 TextLoading loadPlainText(QByteArrayView bytes, LoadedText &loaded,
                           const std::function<bool(qint64 done)> &proceed = {});
 

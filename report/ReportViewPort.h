@@ -33,7 +33,7 @@ public:
 
     /// Whose pane the view is in; the host's until the report says otherwise.
     Pane pane() const { return pane_; }
-    /// Notes whose pane the view stands in, which the report does that has opened it.
+    /// Notes whose pane the view is in; the report that opens it does.
     void setPane(Pane pane) { pane_ = pane; }
 
 private:

@@ -8,7 +8,7 @@
 namespace kareport
 {
 
-/// A piece of template text that remembers where each of its characters stood in the file, through every cut, so that
+/// A piece of template text that remembers where each of its characters was in the file, through every cut, so that
 /// a remark about it can name line and column.
 class ScanText
 {

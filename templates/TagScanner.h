@@ -10,7 +10,7 @@
 namespace kareport
 {
 
-/// Something that the scanner passed over or read in another way than the author may have meant.
+/// Something that the scanner skipped or read in another way than the author may have meant.
 struct ScanNote
 {
     enum class Kind
@@ -43,7 +43,7 @@ struct ScanElement
 /// tag that comes before the opening tag leaves the element unread.
 ///
 /// With `remove` the element is cut out of the text. As many characters are removed as a full closing tag has, also
-/// where the short one stood: templates in use are laid out for that.
+/// where the short one was: templates in use are laid out for that.
 /// @param tag    the name in ASCII capitals
 /// @param notes  where to note what an author may not have meant; null for none
 ScanElement ExtractNode(ScanText &text, QStringView tag, bool remove, ScanNotes *notes = nullptr);

@@ -1067,7 +1067,7 @@
     </message>
     <message>
         <location filename="../sources/csv/CsvRows.cpp"/>
-        <source>"%1" is not an order of columns: each of the letters P, N, E, Z and D at most once, and - for a column that is passed over, was expected, such as PNEZD</source>
+        <source>"%1" is not an order of columns: each of the letters P, N, E, Z and D at most once, and - for a column that is skipped, was expected, such as PNEZD</source>
         <translation>"%1" ist keine Reihenfolge von Spalten: erwartet wurden die Buchstaben P, N, E, Z und D je höchstens einmal, und - für eine Spalte, die übergangen wird, wie PNEZD</translation>
     </message>
     <message>
@@ -1713,7 +1713,7 @@
     </message>
     <message>
         <location filename="../jobs/ColumnNotes.cpp"/>
-        <source>the column "%1" is no variable of the dictionary "%2"</source>
+        <source>the column "%1" is not a variable of the dictionary "%2"</source>
         <translation>die Spalte „%1“ ist keine Variable des Wörterbuchs „%2“</translation>
     </message>
     <message>
@@ -1753,7 +1753,7 @@
     </message>
     <message>
         <location filename="../jobs/CsvOptions.cpp"/>
-        <source>an order of columns such as PNEZD was expected: each of the letters P, N, E, Z and D at most once, and - for a column that is passed over</source>
+        <source>an order of columns such as PNEZD was expected: each of the letters P, N, E, Z and D at most once, and - for a column that is skipped</source>
         <translation>eine Reihenfolge von Spalten wie PNEZD wurde erwartet: die Buchstaben P, N, E, Z und D je höchstens einmal, und - für eine Spalte, die übergangen wird</translation>
     </message>
     <message>

@@ -1067,7 +1067,7 @@
     </message>
     <message>
         <location filename="../sources/csv/CsvRows.cpp"/>
-        <source>"%1" is not an order of columns: each of the letters P, N, E, Z and D at most once, and - for a column that is passed over, was expected, such as PNEZD</source>
+        <source>"%1" is not an order of columns: each of the letters P, N, E, Z and D at most once, and - for a column that is skipped, was expected, such as PNEZD</source>
         <translation>"%1" は列の順序ではありません: 文字 P、N、E、Z、D をそれぞれ 1 回まで、読み飛ばす列には - を使い、PNEZD のように指定する必要があります</translation>
     </message>
     <message>
@@ -1713,7 +1713,7 @@
     </message>
     <message>
         <location filename="../jobs/ColumnNotes.cpp"/>
-        <source>the column "%1" is no variable of the dictionary "%2"</source>
+        <source>the column "%1" is not a variable of the dictionary "%2"</source>
         <translation>列「%1」は辞書「%2」の変数ではありません</translation>
     </message>
     <message>
@@ -1753,7 +1753,7 @@
     </message>
     <message>
         <location filename="../jobs/CsvOptions.cpp"/>
-        <source>an order of columns such as PNEZD was expected: each of the letters P, N, E, Z and D at most once, and - for a column that is passed over</source>
+        <source>an order of columns such as PNEZD was expected: each of the letters P, N, E, Z and D at most once, and - for a column that is skipped</source>
         <translation>PNEZD のような列の順序が必要です: P、N、E、Z、D はそれぞれ 1 回まで、- は読み飛ばす列</translation>
     </message>
     <message>

@@ -16,7 +16,7 @@ bool isJobRunning();
 
 /// Runs a job file in the application, with a window that shows progress and can stop it.
 /// @param error  receives what went wrong; empty when the job was stopped
-/// @param notes  receive what somebody should know of the report
+/// @param notes  receive what the user should know of the report
 /// @return the report, shown in its pane; null when it was not made
 UReportDoc *launchJob(const QString &path, QWidget *parent, QString &error, JobNotes &notes);
 /// The same with a data file and a template.

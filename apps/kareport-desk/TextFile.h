@@ -17,7 +17,7 @@ struct TextFile
     enum class State
     {
         Whole,
-        OtherText, ///< what was read is no such text
+        OtherText, ///< what was read is not such a text
         Stopped,   ///< by the user
         NotRead    ///< the file cannot be read, was cut short meanwhile, or there is no memory for it
     };

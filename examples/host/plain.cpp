@@ -125,7 +125,7 @@ int main(int argc, char **argv)
     report->WriteLine(QStringLiteral("Bench mark 1   143.225"), 0, 1, 0);
     report->UpdateAllViews(nullptr); // shows what was written
     if (argc == 2 && qstrcmp(argv[1], "--once") == 0) {
-        report->SetModifiedFlag(false); // nobody is asked
+        report->SetModifiedFlag(false); // nothing is asked
         QMetaObject::invokeMethod(&window, &QWidget::close, Qt::QueuedConnection);
     }
     return QApplication::exec(); // ends when the window has been closed

@@ -28,7 +28,7 @@ public:
 
     /// Prepares for so many pages. To be called before the first page.
     bool expectPages(qint64 pages);
-    /// Embeds a face for texts in UTF-8. @return null when the file is missing or is no font
+    /// Embeds a face for texts in UTF-8. @return null when the file is missing or is not a font
     HPDF_Font loadFace(const PdfFace &face);
     /// @return null after an error
     HPDF_Page addPage();

@@ -16,7 +16,7 @@ class PdfFace
 public:
     struct Coverage;
 
-    /// Reads what a file covers. A file that is no font covers nothing and is refused when it is embedded.
+    /// Reads what a file covers. A file that is not a font covers nothing and is refused when it is embedded.
     PdfFace(const QString &file, unsigned index, bool isCollection);
     PdfFace(QString file, unsigned index, bool isCollection, std::shared_ptr<const Coverage> coverage);
 

@@ -23,7 +23,7 @@ public:
     const PdfFace &face() const { return face_; }
     bool covers(char32_t character) const { return face_.covers(character); }
 
-    /// Embeds the face. @return false when the file is missing or is no font
+    /// Embeds the face. @return false when the file is missing or is not a font
     bool embed(PdfDocument &pdf);
     bool isEmbedded() const { return font_ != nullptr; }
     HPDF_Font handle() const { return font_; } ///< null until it is embedded

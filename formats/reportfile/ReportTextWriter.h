@@ -29,7 +29,7 @@ public:
     ReportTextWriter(QIODevice &device, LineEnds lineEnds);
     ~ReportTextWriter() override;
 
-    /// Writes what comes next in the text. @return false once a write has failed; what comes then is passed over
+    /// Writes what comes next in the text. @return false once a write has failed; what comes then is ignored
     bool write(QStringView text) override;
     /// The same for characters up to U+00FF.
     bool write(QLatin1StringView text) override;

@@ -81,7 +81,7 @@ private:
 
     std::size_t openGroups() const
     {
-        // The group that is passed over is among the open ones as well.
+        // The group that is skipped is among the open ones as well.
         return outer_.size() + static_cast<std::size_t>(skipDepth_ > 0 ? skipDepth_ - 1 : 0);
     }
     bool isHidden() const { return (state_.characters.flags & HiddenFlag) != 0; }
@@ -99,14 +99,14 @@ private:
 
     RichTextState state_;
     std::vector<RichTextState> outer_; ///< what the ends of the open groups restore
-    int skipDepth_ = 0;                ///< groups open in one that is passed over, with it
-    int *skipNote_ = nullptr;          ///< counts one as soon as the group that is passed over has text
+    int skipDepth_ = 0;                ///< groups open in one that is skipped, with it
+    int *skipNote_ = nullptr;          ///< counts one as soon as the group that is skipped has text
     bool isStarred_ = false;           ///< the next word is one of those that not every reader knows
     int fallback_ = 0;                 ///< characters to leave out, which stand for one in Unicode
     QByteArray bytes_;                 ///< of characters that may have several bytes
     bool cellEnded_ = false;           ///< a tab comes here if more follows in the row
     bool nestedRowEnded_ = false;
-    bool hiddenCounted_ = false; ///< the hidden text that is being passed over
+    bool hiddenCounted_ = false; ///< the hidden text that is being skipped
     bool pageBreak_ = false;     ///< before the next paragraph
     bool sectionBreak_ = false;
     std::unique_ptr<RichTextTarget> target_;

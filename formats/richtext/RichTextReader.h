@@ -25,7 +25,7 @@ struct RichTextNotes
     int hidden = 0;    ///< texts that are marked as hidden
     int signs = 0;     ///< characters of symbol fonts that are not known; they are shown as private characters
 
-    /// A sentence for a person about each kind that was passed over; empty where all is shown.
+    /// A sentence for a person about each kind that was skipped; empty where all is shown.
     QStringList texts() const;
 };
 
@@ -47,7 +47,7 @@ QByteArrayView richTextIn(QByteArrayView bytes);
 
 /// Reads the bytes of a rich-text file (RTF) into a document, whose content is replaced. Bytes from 0x80 on are read in the
 /// code page of the current font, else of the file. What is after the end of the outermost group is not read.
-/// Headers, footers, notes, pictures, objects and hidden text are passed over and counted in `notes`.
+/// Headers, footers, notes, pictures, objects and hidden text are skipped and counted in `notes`.
 /// The signs of the fonts Symbol and Wingdings become the characters that Unicode has for them.
 /// The document keeps no undo steps of what is read.
 /// @return what is wrong, the document then holds what was read up to there; nothing where all was read

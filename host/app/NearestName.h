@@ -6,7 +6,7 @@
 namespace kareport
 {
 
-/// The known name that somebody may have meant by a misspelt one, without regard to case: a few letters are wrong, or one of
+/// The known name that was probably meant by a misspelt one, without regard to case: a few letters are wrong, or one of
 /// the two is the beginning of the other. Empty when none is near. Of names that are equally near, the first.
 QString nearestName(QStringView misspelt, const QStringList &known);
 

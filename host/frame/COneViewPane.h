@@ -29,7 +29,7 @@ public:
     ~COneViewPane() override;
 
     void AddView(std::unique_ptr<UView> view) override;
-    /// Docks the pane in the main frame, or lets it stand alone where there is none.
+    /// Docks the pane in the main frame, or leaves it a window of its own where there is none.
     void SetPlace(CViewPane *parent, unsigned style, const QRect *rect) override;
     void UpdateTitle() override;
     /// Whether the pane is open, be it as a tab that another is before.

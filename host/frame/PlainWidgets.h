@@ -27,7 +27,7 @@ KAREPORT_EXPORT void keepLabelsPlain(const QWidget &window);
 /// A text for a tool tip that is shown literally.
 KAREPORT_EXPORT QString plainToolTip(const QString &text);
 
-/// A text for a menu entry that is shown literally: an ampersand in it is no key, and a tab does not begin the column
+/// A text for a menu entry that is shown literally: an ampersand in it does not mark a key, and a tab does not begin the column
 /// of the keys.
 KAREPORT_EXPORT QString plainMenuText(const QString &text);
 

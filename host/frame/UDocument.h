@@ -93,7 +93,7 @@ public:
 
     /// Whether the document deletes itself when it is closed, as it does at first.
     bool IsAutoDelete() const { return autoDelete_; }
-    /// Sets whether the document deletes itself when it is closed. Where it does not, whoever says so deletes it.
+    /// Sets whether the document deletes itself when it is closed. Where it does not, the code that said so deletes it.
     void SetAutoDelete(bool on) { autoDelete_ = on; }
 
     /// Tells the document that a report it had asked for has been closed and is about to be deleted.

@@ -4,7 +4,7 @@ namespace kareport
 {
 
 /// What the untyped value of a data object points to. The numbers are those that hosts hand to
-/// `UReportDoc::FormatXmlStringToDisplay`; any other number is no value.
+/// `UReportDoc::FormatXmlStringToDisplay`; any other number means no value.
 enum class ValueKind : int
 {
     None = 0,

@@ -79,7 +79,7 @@ bool CsvRows::readColumns(const CsvDialect &dialect)
         wrongChoice_ =
             ColumnFault{std::nullopt, QString(),
                         Xlate("\"%1\" is not an order of columns: each of the letters P, N, E, Z and D at most "
-                              "once, and - for a column that is passed over, was expected, such as PNEZD")
+                              "once, and - for a column that is skipped, was expected, such as PNEZD")
                             .arg(dialect.order)};
         error_ = InputError{file_->path(), std::nullopt, wrongChoice_->text};
         return false;

@@ -12,7 +12,7 @@ namespace kareport
 {
 
 /// A name that a query asks for, while the names of a file go by. A name that is misspelt would otherwise give a list without
-/// rows, and nobody would know why.
+/// rows, and without a reason.
 class LandXmlNames
 {
 public:

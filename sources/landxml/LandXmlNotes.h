@@ -26,7 +26,7 @@ public:
     void passOver(std::string_view element);
     void clear();
 
-    /// All notes: first those with a place, in the order of the file, then the elements that were passed over, by their
+    /// All notes: first those with a place, in the order of the file, then the elements that were skipped, by their
     /// names.
     std::vector<InputError> all() const;
 

@@ -57,7 +57,7 @@ std::variant<LandXmlProfile, LandXmlFault> profileOf(const LandXmlGradeLine &lin
     for (const LandXmlGradePoint &stored : line.points) {
         const bool isRepeated = !points.empty() && stored.kind == LandXmlGradePoint::Kind::Point &&
                                 stored.station == points.back().station && stored.height == points.back().height;
-        if (!isRepeated) { // what stands twice is one point
+        if (!isRepeated) { // what is there twice is one point
             points.push_back(profilePointOf(stored));
             bytes.push_back(stored.byte);
         }

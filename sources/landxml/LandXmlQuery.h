@@ -57,8 +57,8 @@ struct LandXmlQuery
     /// first where it is empty. Other lists must not ask for one.
     QString surface;
 
-    /// Metres in the unit of `interval`, `stations` and `offsets`; nothing for the unit of the file's lengths, which nobody
-    /// knows before the file is read.
+    /// Metres in the unit of `interval`, `stations` and `offsets`; nothing for the unit of the file's lengths, which is not
+    /// known before the file is read.
     std::optional<double> unit = 1.0;
 
     // Of stations:

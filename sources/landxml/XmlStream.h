@@ -54,7 +54,7 @@ public:
     virtual void endElement() = 0;
     /// A piece of text in the innermost element. Elements may stand between two pieces.
     virtual void text(std::string_view piece) = 0;
-    /// An element of another vocabulary, which is passed over with all in it. @param name  with its prefix
+    /// An element of another vocabulary, which is skipped with all in it. @param name  with its prefix
     virtual void foreignElement(std::string_view name) = 0;
 };
 

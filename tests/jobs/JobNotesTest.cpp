@@ -52,19 +52,20 @@ TEST(JobNotes, SayWhatDoesNotComeTogether)
     constexpr Row rows[] = {
         {R"("csv": "good.csv")", tableStep, "", "all fits"},
         {R"("csv": "misspelt.csv")", tableStep,
-         "misspelt.csv:1:8: note: the column \"Nrothing\" is no variable of the dictionary \"Survey\": did you mean "
+         "misspelt.csv:1:8: note: the column \"Nrothing\" is not a variable of the dictionary \"Survey\": did you mean "
          "\"Northing\"?\n"
          "job.json:1:#: note: no column fills the field \"Northing\" of the table \"Points\": did you mean "
          "\"Nrothing\"?",
          "a misspelt column: its rows show 0"},
         {R"("csv": "more.csv")", tableStep,
-         "more.csv:1:17: note: the column \"Code\" is no variable of the dictionary \"Survey\"", "one more column"},
+         "more.csv:1:17: note: the column \"Code\" is not a variable of the dictionary \"Survey\"", "one more column"},
         {R"("csv": "more.csv")", R"({"table": "Points", "data": "p"}, {"table": "Sorted", "data": "p"})",
-         "more.csv:1:17: note: the column \"Code\" is no variable of the dictionary \"Survey\"", "said once"},
+         "more.csv:1:17: note: the column \"Code\" is not a variable of the dictionary \"Survey\"", "said once"},
         {R"("csv": "more.csv", "columns": ["Number", "Northing", "Cod"])", tableStep,
-         "more.csv: note: the column \"Cod\" is no variable of the dictionary \"Survey\"", "a name that the job gives"},
+         "more.csv: note: the column \"Cod\" is not a variable of the dictionary \"Survey\"",
+         "a name that the job gives"},
         {R"("values": [{"Number": "1"}, {"Number": "2", "Nortihng": 2}])", tableStep,
-         "job.json:1:#: note: the column \"Nortihng\" is no variable of the dictionary \"Survey\": did you mean "
+         "job.json:1:#: note: the column \"Nortihng\" is not a variable of the dictionary \"Survey\": did you mean "
          "\"Northing\"?\n"
          "job.json:1:#: note: no column fills the field \"Northing\" of the table \"Points\": did you mean "
          "\"Nortihng\"?",
@@ -74,10 +75,11 @@ TEST(JobNotes, SayWhatDoesNotComeTogether)
         {R"("values": {"Number": "1", "Northing": null})", R"({"block": "Point", "data": "p"})", "",
          "a key without a value is one"},
         {R"("json": "points.json")", tableStep,
-         "points.json:2:3: note: the column \"Code\" is no variable of the dictionary \"Survey\"",
+         "points.json:2:3: note: the column \"Code\" is not a variable of the dictionary \"Survey\"",
          "keys that show with the rows"},
         {R"("sqlite": "points.db", "table": "points")", tableStep,
-         "points.db: note: the column \"Code\" is no variable of the dictionary \"Survey\"", "a database has no place"},
+         "points.db: note: the column \"Code\" is not a variable of the dictionary \"Survey\"",
+         "a database has no place"},
     };
     for (const Row &row : rows) {
         TestJob job;

@@ -122,7 +122,7 @@ TEST(CommandLineData, NotesAreSaidAndWritten)
     const CommandLineFolder folder;
     folder.put("points.csv", "Number,Nort\n1,12.5\n");
     const QByteArray column =
-        "points.csv:1:8: note: the column \"Nort\" is no variable of the dictionary \"Survey\": did "
+        "points.csv:1:8: note: the column \"Nort\" is not a variable of the dictionary \"Survey\": did "
         "you mean \"Northing\"?\n";
     const ProgramRun said = folder.run("render job.json -o a.txt --notes notes.json");
     EXPECT_EQ(said.status, 0) << said.all().constData();
