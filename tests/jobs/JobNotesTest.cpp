@@ -246,6 +246,7 @@ TEST(JobNotes, SayWhichSortKeysAreNoVariables)
             QStringLiteral("t.xml:1:%1: note: ").arg(content.indexOf("<VariableName>" + QByteArray(row.key)) + 1);
         EXPECT_EQ(notesOf(job), *row.expected != 0 ? place.toStdString() + row.expected : "") << row.reason;
         if (*row.expected != 0) {
+            ASSERT_FALSE(job.notes.said().empty()) << row.reason;
             EXPECT_EQ(job.notes.said().front().kind, kareport::JobNote::Kind::UnknownSortKey);
             EXPECT_TRUE(job.text().contains(QStringLiteral("3    |    1.000"))) << job.text().toStdString();
             EXPECT_LT(job.text().indexOf(QStringLiteral("\n2    |")), job.text().indexOf(QStringLiteral("\n1    |")))
