@@ -164,7 +164,7 @@ void readPlaces(const JsonNode &set, LandXmlQuery &query)
     }
 }
 
-/// Differences that are not said: of lengths in millimetres, of directions in ten-thousandths of a gon.
+/// Differences that are not noted: of lengths in millimetres, of directions in ten-thousandths of a gon.
 void readTolerance(const JsonNode &node, LandXmlTolerance &tolerance)
 {
     constexpr double most = 1e6;

@@ -2781,6 +2781,11 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>(the first)</source>
+        <translation>(die erste)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
         <source>(all)</source>
         <translation>(alle)</translation>
     </message>

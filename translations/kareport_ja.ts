@@ -2781,6 +2781,11 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
+        <source>(the first)</source>
+        <translation>(最初のもの)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/LandXmlChoice.cpp"/>
         <source>(all)</source>
         <translation>(すべて)</translation>
     </message>

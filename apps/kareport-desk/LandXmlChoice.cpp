@@ -11,6 +11,7 @@
 #include <QSignalBlocker>
 
 #include <algorithm>
+#include <optional>
 
 namespace kareport
 {
@@ -21,6 +22,7 @@ namespace
 const QString listEntry = QStringLiteral("list");
 const QString intervalEntry = QStringLiteral("interval");
 const QString alignmentEntry = QStringLiteral("alignment");
+const QString gradeLineEntry = QStringLiteral("gradeLine");
 const QString surfaceEntry = QStringLiteral("surface");
 
 /// What a list is called, and whether a file has anything for it.
@@ -54,6 +56,13 @@ std::vector<OfferedList> listsOf(const LandXmlContents &contents)
     };
 }
 
+/// Whether a list is of one of the names of a key, the first where none is chosen; others are of all.
+bool isOne(const QString &key, std::optional<LandXmlListKind> kind)
+{
+    const bool isAlong = kind == LandXmlListKind::Stations || kind == LandXmlListKind::OffsetsOf;
+    return isAlong && (key == gradeLineEntry || key == surfaceEntry);
+}
+
 } // namespace
 
 LandXmlChoice::LandXmlChoice(QFormLayout &form) : form_(form), list_(new QComboBox), interval_(new QDoubleSpinBox)
@@ -72,7 +81,7 @@ LandXmlChoice::LandXmlChoice(QFormLayout &form) : form_(form), list_(new QComboB
     addNames(QStringLiteral("group"), Xlate("&Group:"), Xlate("Group"));
     addNames(QStringLiteral("parcel"), Xlate("&Parcel:"), Xlate("Parcel"));
     addNames(alignmentEntry, Xlate("&Alignment:"), Xlate("Alignment"));
-    addNames(QStringLiteral("gradeLine"), Xlate("Grade li&ne:"), Xlate("Grade line"));
+    addNames(gradeLineEntry, Xlate("Grade li&ne:"), Xlate("Grade line"));
     addNames(surfaceEntry, Xlate("S&urface:"), Xlate("Surface"));
     addRow(Xlate("&Interval:"), Xlate("Interval"), interval_);
     constexpr double mostInterval = 1e6;
@@ -143,7 +152,7 @@ void LandXmlChoice::showRows()
         const std::vector<LandXmlNamed> names = namesOf(row.key);
         const bool isNeeded = kind == LandXmlListKind::OffsetsOf && row.key == alignmentEntry && names.size() > 1;
         if (!isNeeded) {
-            row.box->addItem(Xlate("(all)"), QString());
+            row.box->addItem(isOne(row.key, kind) ? Xlate("(the first)") : Xlate("(all)"), QString());
         }
         for (const LandXmlNamed &named : names) {
             if (!named.name.isEmpty() && row.box->findData(named.name) < 0) {

@@ -8,7 +8,7 @@ namespace kareport
 namespace
 {
 
-/// Where names stand in a list that has each once.
+/// The places of names in a list that has each once.
 class NamesOnce
 {
 public:

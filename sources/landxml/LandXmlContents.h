@@ -35,7 +35,7 @@ struct LandXmlContents
 bool isLandXml(const std::shared_ptr<const FileBytes> &file);
 
 /// Reads what a file holds.
-/// @param progress  is told how many bytes have been read; false ends the reading, with what was read until then
+/// @param progress  is called with the number of bytes that have been read; false ends the reading, with what was read until then
 Expected<LandXmlContents> readLandXmlContents(const std::shared_ptr<const FileBytes> &file,
                                               const ReadProgress &progress);
 

@@ -13,7 +13,7 @@
 namespace kareport
 {
 
-/// Why an element has no geometry, and where it stands.
+/// Why an element has no geometry, and its place in the file.
 struct LandXmlFault
 {
     QString text;

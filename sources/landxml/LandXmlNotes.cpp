@@ -17,7 +17,7 @@ void LandXmlNotes::add(std::size_t byte, const QString &text)
     placed_.push_back({byte, text});
 }
 
-void LandXmlNotes::passOver(std::string_view element)
+void LandXmlNotes::leaveOut(std::string_view element)
 {
     const auto known = passedOver_.find(element);
     if (known != passedOver_.end()) {

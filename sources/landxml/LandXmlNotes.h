@@ -23,7 +23,7 @@ public:
 
     void add(std::size_t byte, const QString &text);
     /// Counts an element that no list reads.
-    void passOver(std::string_view element);
+    void leaveOut(std::string_view element);
     void clear();
 
     /// All notes: first those with a place, in the order of the file, then the elements that were skipped, by their

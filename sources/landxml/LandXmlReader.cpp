@@ -40,7 +40,7 @@ XmlHandler::Interest LandXmlReader::startElement(std::string_view name, const Xm
         if (open_.back().tag == Tag::Geometry && name != "Feature") {
             beginOther(name);
         } else if (open_.size() > 1 || !isHeader(name)) {
-            notes_.passOver(name);
+            notes_.leaveOut(name);
         }
         return Interest::None;
     }
@@ -85,7 +85,7 @@ void LandXmlReader::foreignElement(std::string_view name)
     if (!open_.empty() && open_.back().isRead) {
         text_ += ' ';
     }
-    notes_.passOver(name);
+    notes_.leaveOut(name);
 }
 
 /// Counts what is kept, by the bytes that it takes in a file at the least. What is kept takes far more memory than an empty
@@ -188,7 +188,7 @@ XmlHandler::Interest LandXmlReader::beginInSections(Tag tag, const XmlAttributes
     } else if (tag == Tag::SectionPoint) {
         const auto format = attributes.find("dataFormat");
         if (format && *format != "Offset Elevation") {
-            notes_.passOver("CrossSectPnt " + std::string(*format));
+            notes_.leaveOut("CrossSectPnt " + std::string(*format));
             return Interest::Parts;
         }
         alignments.back().sections.back().surfaces.back().points.push_back({0, 0, textOf(attributes, "code")});

@@ -28,7 +28,7 @@ struct LandXmlWants
 class LandXmlReader : private XmlHandler
 {
 public:
-    /// @param notes  is told what is odd; it must live as long as the reader
+    /// @param notes  receives what is odd; must live as long as the reader
     LandXmlReader(std::shared_ptr<const FileBytes> file, const LandXmlUnits &units, const LandXmlWants &wants,
                   LandXmlNotes &notes);
 

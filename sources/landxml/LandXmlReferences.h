@@ -15,7 +15,7 @@ bool isReference(const LandXmlCoordinates &at);
 bool hasReferences(const std::vector<LandXmlElement> &elements);
 
 /// Gives coordinates the position, the height and the name of the point that they refer to. They stay without a position where
-/// there is no such point. @param notes  is told of names that several points have
+/// there is no such point. @param notes  receives names that several points have
 void resolve(LandXmlCoordinates &at, const LandXmlPointTable &points, LandXmlNotes &notes);
 /// The same for all coordinates of elements.
 void resolve(std::vector<LandXmlElement> &elements, const LandXmlPointTable &points, LandXmlNotes &notes);

@@ -68,7 +68,7 @@ LandXmlReader::Tag LandXmlReader::tagOf(Tag parent, std::string_view name)
     return Tag::None;
 }
 
-/// Whether an element says who made a file and where, which is no data.
+/// Whether an element says who made a file and where, which is not data.
 bool LandXmlReader::isHeader(std::string_view name)
 {
     return name == "Units" || name == "Project" || name == "Application" || name == "CoordinateSystem";

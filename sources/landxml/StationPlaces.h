@@ -20,7 +20,7 @@ class StationPlaces
 public:
     /// @param query  its lengths are in metres
     /// @param unit   metres in the unit that the query was asked in, for notes
-    /// @param notes  is told of stations that the alignment does not have, or has several times
+    /// @param notes  receives stations that the alignment does not have, or has several times
     StationPlaces(const LandXmlQuery &query, double unit, LandXmlNotes &notes)
         : query_(query), unit_(unit), notes_(notes)
     {}

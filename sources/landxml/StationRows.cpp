@@ -167,7 +167,7 @@ bool StationRows::addRoute(std::size_t index)
 }
 
 /// Notes lines beside the alignment that are at the centre of an element, or past it: they turn back there, and their points
-/// are not those that anybody sets out.
+/// are not fit to be set out.
 void StationRows::noteOffsetsPastCentres(const LandXmlRoute &route)
 {
     const auto length = [this](double metres) { return QString::number(metres / source_.unit, 'f', 3); };

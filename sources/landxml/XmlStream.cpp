@@ -4,7 +4,6 @@
 #include "Xlate.h"
 
 #include <algorithm>
-#include <array>
 #include <expat.h>
 #include <string>
 
@@ -207,7 +206,7 @@ void XmlStream::started(const char *name, const char *const *attributes)
         fail(currentByte(), Xlate("the elements are nested more than %1 deep").arg(deepest));
         return;
     }
-    if (passedOverFrom_ != 0) {
+    if (leftOutFrom_ != 0) {
         return;
     }
     wantText(false);
@@ -215,32 +214,28 @@ void XmlStream::started(const char *name, const char *const *attributes)
     vocabulary_.begin(name, attributes, depth_);
     if (!vocabulary_.has(name)) {
         handler_.foreignElement(name);
-        passedOverFrom_ = depth_;
+        leftOutFrom_ = depth_;
         return;
     }
-    std::string_view local = name;
-    if (const std::size_t colon = local.find(':'); colon != std::string_view::npos) {
-        local.remove_prefix(colon + 1);
-    }
-    const auto interest = handler_.startElement(local, found);
+    const auto interest = handler_.startElement(XmlVocabulary::withoutPrefix(name), found);
     wantText(interest == XmlHandler::Interest::Text);
     textWanted_.set(static_cast<std::size_t>(depth_), wantsText_);
     if (interest == XmlHandler::Interest::None) {
-        passedOverFrom_ = depth_;
+        leftOutFrom_ = depth_;
     }
 }
 
 void XmlStream::ended()
 {
-    if (passedOverFrom_ == 0) {
+    if (leftOutFrom_ == 0) {
         handler_.endElement();
-    } else if (passedOverFrom_ == depth_) {
-        passedOverFrom_ = 0;
+    } else if (leftOutFrom_ == depth_) {
+        leftOutFrom_ = 0;
     }
     vocabulary_.end(depth_);
     --depth_;
     // The text after an element belongs to the one around it.
-    wantText(passedOverFrom_ == 0 && textWanted_.test(static_cast<std::size_t>(depth_)));
+    wantText(leftOutFrom_ == 0 && textWanted_.test(static_cast<std::size_t>(depth_)));
 }
 
 /// Has the parser tell text or leave it out: most text of a file belongs to elements of which nothing is wanted.

@@ -18,7 +18,7 @@ struct XML_ParserStruct;
 namespace kareport
 {
 
-/// The attributes of an element, valid while its start is told.
+/// The attributes of an element, valid until `startElement` returns.
 class XmlAttributes
 {
 public:
@@ -52,14 +52,14 @@ public:
     ///              not ended either
     virtual Interest startElement(std::string_view name, const XmlAttributes &attributes) = 0;
     virtual void endElement() = 0;
-    /// A piece of text in the innermost element. Elements may stand between two pieces.
+    /// A piece of text in the innermost element. There may be elements between two pieces.
     virtual void text(std::string_view piece) = 0;
     /// An element of another vocabulary, which is skipped with all in it. @param name  with its prefix
     virtual void foreignElement(std::string_view name) = 0;
 };
 
 /// Reads an XML file from start to end in one pass, without a document in memory. What belongs to the vocabulary of the
-/// outermost element is told, whatever its prefix is.
+/// outermost element is reported, whatever its prefix is.
 ///
 /// No other file is ever opened. A file that declares entities, or whose document type is in another file, is refused: files
 /// that programs exchange need neither, and entities can make a small file endless. Depth and the size of a tag are bounded.
@@ -82,7 +82,7 @@ public:
     const std::optional<InputError> &error() const { return error_; }
 
     // For the handler:
-    /// Where the tag or the text stands that is told.
+    /// The place of the tag or the text that is being reported.
     std::size_t currentByte() const;
     /// Ends the reading.
     void stop();
@@ -103,7 +103,7 @@ private:
     XmlVocabulary vocabulary_;
     std::size_t position_ = 0;
     int depth_ = 0;
-    int passedOverFrom_ = 0;              ///< depth of the element that nothing is told of; 0 when there is none
+    int leftOutFrom_ = 0;                 ///< depth of the element that is left out; 0 when there is none
     bool wantsText_ = false;              ///< of the innermost element
     std::bitset<deepest + 1> textWanted_; ///< of the elements that are open, by their depth
     bool isStopped_ = false;

@@ -10,7 +10,7 @@
 namespace kareport
 {
 
-/// Which prefixes of an XML file stand for the vocabulary of its outermost element. What a name costs does not depend on how
+/// Which prefixes of an XML file mean the vocabulary of its outermost element. What a name costs does not depend on how
 /// many prefixes are declared.
 class XmlVocabulary
 {
@@ -23,13 +23,19 @@ public:
     void end(int depth);
     /// Whether an element belongs to the vocabulary. @param name  with its prefix
     bool has(std::string_view name) const;
+    /// The name of an element after its prefix.
+    static std::string_view withoutPrefix(std::string_view name)
+    {
+        const std::size_t colon = name.find(':');
+        return colon == std::string_view::npos ? name : name.substr(colon + 1);
+    }
 
 private:
     struct Hash : std::hash<std::string_view>
     {
         using is_transparent = void;
     };
-    /// What a prefix stands for, the innermost declaration last.
+    /// Whether a prefix means the vocabulary, the innermost declaration last.
     using Declarations = std::vector<bool>;
     using Prefixes = std::unordered_map<std::string, Declarations, Hash, std::equal_to<>>;
 

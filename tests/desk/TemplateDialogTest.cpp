@@ -216,6 +216,7 @@ TEST_F(TemplateDialogs, OffersTheListsAndTheNamesOfALandXmlFile)
     EXPECT_EQ(shownRows(dialog),
               QStringList({QStringLiteral("List"), QStringLiteral("Alignment"), QStringLiteral("Grade line"),
                            QStringLiteral("Surface"), QStringLiteral("Interval")}));
+    EXPECT_EQ(itemsOf(dialog, "Grade line"), QStringList({QStringLiteral("(the first)"), QStringLiteral("design")}));
     press(dialog, "Alignment", "road");
     press(dialog, "Surface", "ground");
     widgetOf<QDoubleSpinBox>(dialog, "Interval")->setValue(25);

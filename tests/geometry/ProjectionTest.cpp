@@ -4,6 +4,8 @@
 
 #include <gtest/gtest.h>
 
+#include <limits>
+
 namespace
 {
 
@@ -125,6 +127,33 @@ TEST(Projection, ACentreIsSaidWhereItIsNearest)
     alignment.add(curveOf(TransitionForm::Clothoid, 300, 0, 0, {-100, 40}, 0));
     EXPECT_EQ(nearestFoot(alignment, {0, 50})->kind, Kind::Perpendicular) << "another element is nearer";
     EXPECT_FALSE(nearestFoot(Alignment(), {0, 0})) << "there is nothing to belong to";
+}
+
+TEST(Projection, TheNearestPlaceOfManyPointsIsTheFirstOfAll)
+{
+    RandomRuns runs("nearest", 1, 10);
+    while (runs.next()) {
+        RandomNumbers random(runs.seed());
+        const Alignment alignment = randomAlignment(random, 1 + random.below(150), 1);
+        const NearestFoot tree(alignment);
+        const PlanePoint middle = alignment.at(alignment.length() / 2)->point;
+        for (int i = 0; i < 50; ++i) {
+            const PlanePoint point =
+                middle + PlanePoint{double(random.below(20000) - 10000), double(random.below(20000) - 10000)};
+            const auto nearest = tree.of(point);
+            ASSERT_TRUE(nearest) << "seed " << runs.seed();
+            EXPECT_NEAR(std::fabs(nearest->offset), std::fabs(feetOn(alignment, point).front().offset), 1e-7)
+                << "seed " << runs.seed();
+        }
+    }
+}
+
+TEST(Projection, NumbersThatAreTooLargeHaveNoPlace)
+{
+    Alignment alignment;
+    alignment.add(curveOf(TransitionForm::Clothoid, 100, 0, 0, {-1.7e308, 1.7e308}, pi / 4));
+    EXPECT_FALSE(nearestFoot(alignment, {1.7e308, -1.7e308})) << "neither ahead nor back can be told";
+    EXPECT_FALSE(nearestFoot(hook(), {std::numeric_limits<double>::quiet_NaN(), 0}));
 }
 
 } // namespace

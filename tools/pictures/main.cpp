@@ -17,6 +17,7 @@
 #include "UReportWindowDlg.h"
 
 #include <QApplication>
+#include <QComboBox>
 #include <QCommandLineParser>
 #include <QDir>
 #include <QEventLoop>
@@ -131,6 +132,20 @@ void takeDialogs(Pictures &pictures, const QString &examples)
     pictures.take(fromTemplate, "template");
     fromTemplate.setTemplateFile(QDir(examples).filePath(QStringLiteral("data/control.csv")));
     pictures.take(fromTemplate, "template-wrong");
+    fromTemplate.setTemplateFile(QDir(examples).filePath(QStringLiteral("landxml.xml")));
+    fromTemplate.setData(QDir(examples).filePath(QStringLiteral("data/road.xml")));
+    const auto choose = [&](const char *name, const char *value) {
+        for (auto *box : fromTemplate.findChildren<QComboBox *>()) {
+            if (box->accessibleName() == QString::fromLatin1(name)) {
+                box->setCurrentIndex(box->findData(QString::fromLatin1(value)));
+            }
+        }
+    };
+    choose("Template", "STATIONS");
+    choose("List", "stations");
+    choose("Alignment", "RR-1");
+    choose("Surface", "ground");
+    pictures.take(fromTemplate, "template-landxml");
     kareport::PageSetup setup;
     setup.margins = kareport::defaultMargins;
     kareport::fillPrinters(setup);
