@@ -2,17 +2,19 @@
 # Says what in programs and libraries (ELF) would help an attacker: a search path that leads into the current folder, and
 # protections that the build was to put in and did not. Prints one line for each; exit status 1 when there is one.
 #
-#   scripts/check-binaries.sh [--paths-only] FILE...
+#   scripts/check-binaries.sh [--paths-only | --outside] FILE...
 #
 # --paths-only looks at the search paths alone, as for tests, which are built without the protections.
+# --outside does so too, and lets them lead into absolute folders, as those of a program do that is not installed.
 set -euo pipefail
 
 paths_only=0
-if [ "${1:-}" = --paths-only ]; then
-    paths_only=1
-    shift
-fi
-[ $# -gt 0 ] || { echo "usage: check-binaries.sh [--paths-only] FILE..." >&2; exit 1; }
+outside=0
+case "${1:-}" in
+--paths-only) paths_only=1; shift ;;
+--outside) paths_only=1; outside=1; shift ;;
+esac
+[ $# -gt 0 ] || { echo "usage: check-binaries.sh [--paths-only | --outside] FILE..." >&2; exit 1; }
 
 failed=0
 wrong() { # file, what is wrong
@@ -31,6 +33,7 @@ check_paths() {
         case "$element" in
             '$ORIGIN' | '$ORIGIN/'*) ;;
             '') wrong "$file" "the search path [$path] has an empty element, which is the current folder" ;;
+            /*) [ $outside = 1 ] || wrong "$file" "the search path [$path] has the element \"$element\": one at \$ORIGIN was expected" ;;
             *) wrong "$file" "the search path [$path] has the element \"$element\": one at \$ORIGIN was expected" ;;
         esac
     done <<< "$path:"

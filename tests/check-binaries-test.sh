@@ -69,6 +69,9 @@ expect 'the element "."' -- -Wl,-rpath,.
 expect 'the element "lib"' -- -Wl,-rpath,lib
 expect 'the element "/opt/lib"' -- -Wl,-rpath,/opt/lib
 expect 'the element "."' --paths-only -- -Wl,-rpath,.
+expect '' --outside -- -Wl,-rpath,/opt/lib -no-pie -fno-pie
+expect 'an empty element' --outside -- -Wl,-rpath,/opt/lib:
+expect 'the element "lib"' --outside -- -Wl,-rpath,/opt/lib:lib
 expect 'loaded at a fixed address' -- -no-pie -fno-pie
 expect 'no GNU_RELRO' -- -Wl,-z,norelro
 expect 'no BIND_NOW' -- -Wl,-z,lazy

@@ -32,19 +32,25 @@ set_tests_properties(package.headers PROPERTIES TIMEOUT 900)
 add_test(NAME package.pkg-config COMMAND ${CMAKE_CURRENT_SOURCE_DIR}/package/pkg-config-test.sh ${CMAKE_CXX_COMPILER}
          ${prefix}/${CMAKE_INSTALL_LIBDIR} ${outside} ${PROJECT_VERSION})
 # The example host is built and run in the same way, as its guide says.
+set(example ${CMAKE_CURRENT_BINARY_DIR}/package/example)
 add_test(NAME package.example COMMAND ${CMAKE_CTEST_COMMAND}
-         --build-and-test ${PROJECT_SOURCE_DIR}/examples/host ${CMAKE_CURRENT_BINARY_DIR}/package/example
+         --build-and-test ${PROJECT_SOURCE_DIR}/examples/host ${example}
          --build-generator ${CMAKE_GENERATOR}
          --build-options -DCMAKE_PREFIX_PATH=${prefix} -DCMAKE_BUILD_TYPE=Debug
-         --test-command ${CMAKE_CURRENT_BINARY_DIR}/package/example/host ${CMAKE_CURRENT_BINARY_DIR}/package)
-add_test(NAME package.example.plain COMMAND ${CMAKE_CURRENT_BINARY_DIR}/package/example/plain --once)
+         --test-command ${example}/host ${CMAKE_CURRENT_BINARY_DIR}/package)
+add_test(NAME package.example.plain COMMAND ${example}/plain --once)
 set_tests_properties(package.example PROPERTIES FIXTURES_SETUP package.examples)
 set_tests_properties(package.example.plain PROPERTIES FIXTURES_REQUIRED package.examples TIMEOUT 60
                                                       ENVIRONMENT QT_QPA_PLATFORM=offscreen)
 set_tests_properties(package.binaries package.exports package.listed package.use package.pkg-config package.example
                      PROPERTIES FIXTURES_REQUIRED package)
+# What our package says to those who link with it leads none of them into the current folder.
+add_test(NAME package.paths COMMAND ${check_binaries} --outside ${outside}/consumer ${outside}/standalone
+                                    ${outside}/own-host-program ${outside}/own-host/$<TARGET_SONAME_FILE_NAME:KaReportHost>
+                                    ${example}/host ${example}/plain)
+set_tests_properties(package.paths PROPERTIES FIXTURES_REQUIRED "package.built;package.examples")
 add_test(NAME package.api COMMAND ${PROJECT_SOURCE_DIR}/scripts/api-docs.sh ${CMAKE_CURRENT_BINARY_DIR}/package/api)
 
 # They build programs outside, which takes longer than all the rest.
 set_tests_properties(package.use package.own-host package.standalone package.headers package.pkg-config package.example
-                     package.example.plain PROPERTIES LABELS heavy)
+                     package.example.plain package.paths PROPERTIES LABELS heavy)
