@@ -161,8 +161,15 @@ void World::reopen(Chance &chance)
     const bool byCommand = chance.oneIn(2);
     did = report.GetPathName() + (byCommand ? QStringLiteral(" by the command") : QString());
     const QString ending = QFileInfo(report.GetPathName()).suffix();
+    // A report may have a name whose file was removed: to open that name brings the report to the front.
+    const auto isTaken = [](const QString &path) {
+        const std::vector<UReportDoc *> open = reports();
+        return QFile::exists(path) || std::any_of(open.begin(), open.end(), [&path](const UReportDoc *report) {
+                   return report->GetPathName() == path;
+               });
+    };
     QString copy;
-    for (int number = 1; copy.isEmpty() || QFile::exists(copy); ++number) {
+    for (int number = 1; copy.isEmpty() || isTaken(copy); ++number) {
         copy = files().filePath(QStringLiteral("copy %1.%2").arg(number).arg(ending));
     }
     const qint64 limit = fileLimit();
