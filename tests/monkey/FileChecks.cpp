@@ -164,8 +164,8 @@ void World::reopen(Chance &chance)
     // A report may have a name whose file was removed: to open that name brings the report to the front.
     const auto isTaken = [](const QString &path) {
         const std::vector<UReportDoc *> open = reports();
-        return QFile::exists(path) || std::any_of(open.begin(), open.end(), [&path](const UReportDoc *report) {
-                   return report->GetPathName() == path;
+        return QFile::exists(path) || std::any_of(open.begin(), open.end(), [&path](const UReportDoc *each) {
+                   return each->GetPathName() == path;
                });
     };
     QString copy;
