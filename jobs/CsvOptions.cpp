@@ -1,6 +1,7 @@
 #include "CsvOptions.h"
 
 #include "ColumnChoices.h"
+#include "NearestName.h"
 #include "Xlate.h"
 
 namespace kareport
@@ -143,7 +144,8 @@ CsvDialect readCsvDialect(const JsonNode &set)
         if (const auto known = textEncodingFromKey(encoding.text())) {
             dialect.encoding = *known;
         } else {
-            encoding.fail(Xlate("one of %1 was expected").arg(QStringLiteral("utf-8, latin-1, windows-1252, utf-16")));
+            const QString keys = QStringLiteral("utf-8, latin-1, windows-1252, utf-16");
+            encoding.fail(oneOfExpected(encoding.text(), keys.split(QStringLiteral(", "))));
         }
     }
     readNumberStyle(set, dialect.numbers);

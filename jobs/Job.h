@@ -51,6 +51,7 @@ struct Job
         bool writeTableName = false;
         bool printHash = false;
         bool excel = false;
+        bool placeholders = false; ///< texts of the report have placeholders such as {lengthUnit}
         std::optional<QString> chainageLabel;
         std::optional<char16_t> separator;
     };

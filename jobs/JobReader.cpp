@@ -6,6 +6,8 @@
 #include "JobSettings.h"
 #include "JobStepsReader.h"
 #include "JsonNode.h"
+#include "NearestName.h"
+#include "Placeholders.h"
 #include "Xlate.h"
 
 #include <QDir>
@@ -49,13 +51,14 @@ Job::Page readPage(const JsonNode &node, Job::Page page)
             }
         }
         if (!known) {
-            paper.fail(Xlate("one of %1 was expected").arg(keys.join(QStringLiteral(", "))));
+            paper.fail(oneOfExpected(paper.text(), keys));
         }
     }
     if (const JsonNode orientation = node["orientation"]; orientation.exists()) {
         page.portrait = orientation.text() == u"portrait";
         if (!page.portrait && orientation.text() != u"landscape") {
-            orientation.fail(Xlate("one of %1 was expected").arg(QStringLiteral("portrait, landscape")));
+            orientation.fail(
+                oneOfExpected(orientation.text(), QStringLiteral("portrait, landscape").split(QStringLiteral(", "))));
         }
     }
     if (const JsonNode printer = node["printer"]; printer.exists()) {
@@ -93,13 +96,17 @@ Job::Options readOptions(const JsonNode &node)
     if (!node.expectObject()) {
         return options;
     }
-    node.allowOnly({"zeroBlank", "writeTableName", "printHash", "chainageLabel", "separator", "excel"});
+    node.allowOnly({"zeroBlank", "writeTableName", "printHash", "chainageLabel", "separator", "excel", "placeholders"});
     options.zeroBlank = node["zeroBlank"].boolean(false);
     options.writeTableName = node["writeTableName"].boolean(false);
     options.printHash = node["printHash"].boolean(false);
     options.excel = node["excel"].boolean(false);
+    options.placeholders = node["placeholders"].boolean(false);
     if (const JsonNode label = node["chainageLabel"]; label.exists()) {
         options.chainageLabel = label.text();
+        if (const auto wrong = options.placeholders ? Placeholders::wrongIn(label.text()) : std::nullopt) {
+            label.fail(*wrong);
+        }
     }
     if (const JsonNode separator = node["separator"]; separator.exists()) {
         if (separator.value().isString() && separator.text().size() == 1) {
@@ -127,7 +134,7 @@ std::optional<Output> readOutput(const JsonNode &node, const QDir &folder, std::
     const JsonNode as = node["as"];
     const auto kind = as.exists() ? outputKindFromName(as.text()) : outputKindOf(name, otherwise);
     if (!kind && as.exists()) {
-        as.fail(Xlate("one of %1 was expected").arg(outputKindNames()));
+        as.fail(oneOfExpected(as.text(), outputKindNames().split(QStringLiteral(", "))));
         return std::nullopt;
     }
     if (!kind) {

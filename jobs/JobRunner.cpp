@@ -4,6 +4,7 @@
 #include "DataRemarks.h"
 #include "Interrupt.h"
 #include "JobSteps.h"
+#include "LabelPlaceholders.h"
 #include "ReportTextCodec.h"
 #include "TemplateSource.h"
 #include "Xlate.h"
@@ -56,6 +57,12 @@ std::optional<InputError> JobRunner::run(UReportDoc &report, ReportTextWriter *s
     DataRemarks remarks;
     ReportSurroundings surroundings = surroundingsOf(job_);
     surroundings.remarks = &remarks;
+    remarks.measures = isMeasuring_;
+    placeholders_.reset();
+    if (job_.options.placeholders) {
+        placeholders_ = std::make_unique<Placeholders>(job_.settings, job_.application, surroundings.time, job_.title);
+    }
+    surroundings.placeholders = placeholders_.get();
     report.SetSurroundings(surroundings);
     const auto restored = qScopeGuard([&report] { report.SetSurroundings(std::nullopt); });
     if (auto error = prepare(report)) {
@@ -68,7 +75,13 @@ std::optional<InputError> JobRunner::run(UReportDoc &report, ReportTextWriter *s
     };
     JobData data(job_, source_, progress_, isStopped);
     notes_ = JobNotes();
-    return JobSteps(job_, source_, data, report, {notes_, isStrict_ || job_.strict, remarks}, isStopped).write();
+    JobSteps steps(job_, source_, data, report, {notes_, isStrict_ || job_.strict, remarks}, isStopped);
+    steps.setPlaceholders(placeholders_.get());
+    fits_.clear();
+    if (isMeasuring_ && job_.reportTemplate) {
+        steps.measureInto(fits_, FormatWidths(job_.reportTemplate->file, job_.reportTemplate->name));
+    }
+    return steps.write();
 }
 
 std::optional<InputError> JobRunner::prepare(UReportDoc &report)
@@ -116,6 +129,11 @@ std::optional<InputError> JobRunner::loadTemplate(UReportDoc &report)
     if (auto wrong = wrongTemplateSource(path)) {
         return wrong;
     }
+    if (placeholders_) {
+        if (auto wrong = wrongLabelPlaceholder(path, name)) {
+            return wrong;
+        }
+    }
     if (report.LoadTemplateFile(path, name, QString(), QString())) {
         return std::nullopt;
     }
@@ -129,7 +147,9 @@ void JobRunner::applyOptions(UReportDoc &report)
     report.SetZeroBlank(job_.options.zeroBlank);
     report.WriteTableName(job_.options.writeTableName);
     if (job_.options.chainageLabel) {
-        report.SetChainageLabel(*job_.options.chainageLabel);
+        const QString title = report.GetTemplate() != nullptr ? report.GetTemplate()->GetTemplateTitle() : QString();
+        const QString &label = *job_.options.chainageLabel;
+        report.SetChainageLabel(placeholders_ ? placeholders_->textOf(label, title) : label);
     }
     if (job_.options.excel) {
         report.SetExcelFormat();

@@ -4,12 +4,16 @@
 #include "Job.h"
 #include "JobNotes.h"
 #include "JsonSource.h"
+#include "Placeholders.h"
 #include "Progress.h"
 #include "ReportSurroundings.h"
+#include "StepFit.h"
 #include "UReportDoc.h"
 
 #include <functional>
+#include <memory>
 #include <optional>
+#include <vector>
 
 namespace kareport
 {
@@ -34,6 +38,10 @@ public:
 
     /// Makes a note an error: the report is not made then, and the notes so far are kept.
     void beStrict() { isStrict_ = true; }
+    /// Has it measured how the data of each step fits its table or block. Off unless somebody asks: it takes time.
+    void measure() { isMeasuring_ = true; }
+    /// How the steps of the report that was made last fit, in their order, those alone that were written.
+    const std::vector<StepFit> &fits() const { return fits_; }
     /// The notes on the report that was made last, also on one that was not finished.
     const JobNotes &notes() const { return notes_; }
 
@@ -57,6 +65,9 @@ private:
     Progress &progress_;
     std::function<bool()> isToStop_;
     bool isStrict_ = false;
+    bool isMeasuring_ = false;
+    std::vector<StepFit> fits_;
+    std::unique_ptr<Placeholders> placeholders_; ///< of the job's texts; null where they have none
     JobNotes notes_;
 };
 

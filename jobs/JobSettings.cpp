@@ -1,5 +1,6 @@
 #include "JobSettings.h"
 
+#include "NearestName.h"
 #include "OrientationOrder.h"
 #include "Xlate.h"
 
@@ -47,7 +48,7 @@ void choose(const JsonNode &node, Find find, const char *expected, Value &value)
     if (const auto found = find(node.text())) {
         value = static_cast<Value>(*found);
     } else {
-        node.fail(Xlate("one of %1 was expected").arg(QLatin1StringView(expected)));
+        node.fail(oneOfExpected(node.text(), QString(QLatin1StringView(expected)).split(QStringLiteral(", "))));
     }
 }
 

@@ -1,5 +1,6 @@
 #include "JobSteps.h"
 
+#include "NearestName.h"
 #include "TemplateCheck.h"
 #include "UXmlReportTpl.h"
 #include "Xlate.h"
@@ -37,13 +38,13 @@ std::optional<InputError> JobSteps::write()
 
 JobSteps::Wrong JobSteps::write(const Job::Heading &step, const JsonPath & /*path*/)
 {
-    report_.SetHeading(step.text, step.before, step.after);
+    report_.SetHeading(shownText(step.text), step.before, step.after);
     return std::nullopt;
 }
 
 JobSteps::Wrong JobSteps::write(const Job::Line &step, const JsonPath & /*path*/)
 {
-    report_.WriteLine(step.text, step.before, step.after, step.style);
+    report_.WriteLine(shownText(step.text), step.before, step.after, step.style);
     return std::nullopt;
 }
 
@@ -104,6 +105,7 @@ JobSteps::Wrong JobSteps::write(const Job::Block &step, const JsonPath &path)
         return isStopped_() ? std::nullopt : std::optional(data_.noRow(step.data, path));
     }
     needMemory(report_.WriteDataBlock(step.name, &first, step.before, step.after));
+    addFit(false, step.name, block->Fields, step.data, path);
     return noteValues(rows, record);
 }
 
@@ -135,6 +137,7 @@ JobSteps::Wrong JobSteps::write(const Job::Table &step, const JsonPath &path)
     if (const auto error = rows.error()) {
         return error;
     }
+    addFit(true, step.name, table->Fields, step.data, path);
     if (auto wrong = noteColumns(rows, step.data, record)) {
         return wrong;
     }
@@ -149,9 +152,27 @@ JobSteps::Wrong JobSteps::write(const Job::Table &step, const JsonPath &path)
 JobSteps::Wrong JobSteps::noSuchRecord(const QString &what, const QString &name, const QStringList &names,
                                        const JsonPath &path) const
 {
-    return source_.errorAt(path,
-                           Xlate("the template has no %1 named \"%2\": one of %3 was expected")
-                               .arg(what, name, names.isEmpty() ? Xlate("none") : names.join(QStringLiteral(", "))));
+    return source_.errorAt(
+        path, Xlate("the template has no %1 named \"%2\": %3").arg(what, name, oneOfExpected(name, names)));
+}
+
+/// A text of the job as the report shows it.
+QString JobSteps::shownText(const QString &text) const
+{
+    if (placeholders_ == nullptr) {
+        return text;
+    }
+    const UXmlReportTpl *tpl = report_.GetTemplate();
+    return placeholders_->textOf(text, tpl != nullptr ? tpl->GetTemplateTitle() : QString());
+}
+
+void JobSteps::addFit(bool isTable, const QString &name, const sXmlReportFields &fields, const QString &data,
+                      const JsonPath &path)
+{
+    if (fits_ != nullptr) {
+        fits_->push_back({isTable, name, data, source_.errorAt(path, QString()), notes_.remarks.rows,
+                          fieldFits(isTable, name, fields, notes_.remarks, *widths_)});
+    }
 }
 
 /// What keeps a table or block that the template has from being written.

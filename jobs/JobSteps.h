@@ -5,11 +5,15 @@
 #include "Job.h"
 #include "JobData.h"
 #include "JsonSource.h"
+#include "Placeholders.h"
+#include "StepFit.h"
 #include "TemplatePlaces.h"
 #include "UReportDoc.h"
 
 #include <functional>
+#include <memory>
 #include <optional>
+#include <vector>
 
 namespace kareport
 {
@@ -37,6 +41,15 @@ public:
         : job_(job), source_(source), data_(data), report_(report), notes_(notes), isStopped_(isStopped)
     {}
 
+    /// Says what the placeholders of lines and headings stand for; null where they have none. They must outlive the steps.
+    void setPlaceholders(const Placeholders *placeholders) { placeholders_ = placeholders; }
+    /// Adds to a list how the data of each step fits, from the remarks on it, which must have the widest values.
+    void measureInto(std::vector<StepFit> &fits, FormatWidths widths)
+    {
+        fits_ = &fits;
+        widths_ = std::make_unique<FormatWidths>(std::move(widths));
+    }
+
     /// @return what is wrong with a step or with its data; nothing when all steps were written or the work was stopped
     /// @throws std::bad_alloc where the report has lost text: half a report counts as none
     std::optional<InputError> write();
@@ -60,6 +73,9 @@ private:
     Wrong noteField(const UnfilledField &field, const WrittenRecord &record);
     Wrong noteSortKeys(const WrittenRecord &record);
     Wrong noteSource(const RowList &rows);
+    QString shownText(const QString &text) const;
+    void addFit(bool isTable, const QString &name, const sXmlReportFields &fields, const QString &data,
+                const JsonPath &path);
     Wrong noteValues(const RowList &rows, const WrittenRecord &record);
     Wrong noteValue(const ColumnRemarks &column, const RowList &rows, const WrittenRecord &record);
     InputError inTemplate(TemplatePart part, const QString &variable, const WrittenRecord &record,
@@ -71,6 +87,9 @@ private:
     UReportDoc &report_;
     StepNotes notes_;
     const std::function<bool()> &isStopped_;
+    const Placeholders *placeholders_ = nullptr;
+    std::vector<StepFit> *fits_ = nullptr; ///< null where nobody measures
+    std::unique_ptr<FormatWidths> widths_;
 };
 
 } // namespace kareport

@@ -1,5 +1,7 @@
 #include "JobStepsReader.h"
 
+#include "NearestName.h"
+#include "Placeholders.h"
 #include "Xlate.h"
 
 #include <limits>
@@ -71,9 +73,24 @@ std::optional<Job::Step> readStep(const JsonNode &node)
     return std::nullopt;
 }
 
-/// The data set that a step shows, and the template that it is shown through, must be there.
+QStringList namesOfDataSets(const Job &job)
+{
+    QStringList names = job.data.keys();
+    names.sort();
+    return names;
+}
+
+/// The data set that a step shows, and the template that it is shown through, must be there, and placeholders be known.
 void checkStep(const JsonNode &node, const Job &job)
 {
+    for (const char *key : {"heading", "line"}) {
+        const JsonNode text = node[QString::fromLatin1(key)];
+        if (job.options.placeholders && text.isText()) {
+            if (const auto wrong = Placeholders::wrongIn(text.text())) {
+                text.fail(*wrong);
+            }
+        }
+    }
     for (const char *key : {"block", "table"}) {
         if (!node[QString::fromLatin1(key)].exists()) {
             continue;
@@ -86,7 +103,8 @@ void checkStep(const JsonNode &node, const Job &job)
         if (!data.exists()) {
             node.fail(Xlate("the key \"data\" with the name of a data set was expected"));
         } else if (!job.data.contains(data.text())) {
-            data.fail(Xlate("there is no data set named \"%1\" in the job").arg(data.text()));
+            data.fail(Xlate("there is no data set named \"%1\" in the job: %2")
+                          .arg(data.text(), oneOfExpected(data.text(), namesOfDataSets(job))));
         }
     }
 }

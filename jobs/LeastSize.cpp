@@ -19,6 +19,7 @@ public:
     explicit Count(const Job &job)
         : linesPerPage_(job.page.linesPerPage),
           hasHeader_(job.header && !job.options.excel),
+          hasPlaceholders_(job.options.placeholders),
           headerBytes_(job.application.toUtf8().size() + digitsOfPage)
     {}
 
@@ -62,7 +63,9 @@ private:
 
     void write(const QString &text)
     {
-        bytes_ += text.toUtf8().size() - text.count(QStringLiteral("\r\n"));
+        if (!hasPlaceholders_ || !text.contains(u'{')) { // what is put in may be shorter than its name
+            bytes_ += text.toUtf8().size() - text.count(QStringLiteral("\r\n"));
+        }
         addLines(text.count(u'\n'));
     }
 
@@ -122,6 +125,7 @@ private:
 
     std::optional<int> linesPerPage_;
     bool hasHeader_;
+    bool hasPlaceholders_;
     qint64 headerBytes_;
     Job::Heading heading_{};
     qint64 bytes_ = 0;

@@ -1,5 +1,6 @@
 #include "TemplateSource.h"
 
+#include "NearestName.h"
 #include "TemplateCheck.h"
 #include "TemplateNames.h"
 #include "Xlate.h"
@@ -56,9 +57,7 @@ InputError whyNotLoaded(const QString &path, const TemplateFile &file, const QSt
     if (names.isEmpty()) {
         return {path, TextPlace(), Xlate("the file holds no template: a <ReportTemplate> element was expected")};
     }
-    return {
-        path, TextPlace(),
-        Xlate("there is no template named \"%1\": one of %2 was expected").arg(name, names.join(QStringLiteral(", ")))};
+    return {path, TextPlace(), Xlate("there is no template named \"%1\": %2").arg(name, oneOfExpected(name, names))};
 }
 
 } // namespace kareport

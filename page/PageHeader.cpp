@@ -127,7 +127,17 @@ std::optional<int> usualDistance(const std::vector<qint64> &lines)
 
 QString pageHeaderDate(const QDateTime &time)
 {
-    return QLocale::c().toString(time, QStringLiteral("MMM dd, yyyy  hh:mmAP"));
+    return pageHeaderDay(time) + QStringLiteral("  ") + pageHeaderHour(time);
+}
+
+QString pageHeaderDay(const QDateTime &time)
+{
+    return QLocale::c().toString(time, QStringLiteral("MMM dd, yyyy"));
+}
+
+QString pageHeaderHour(const QDateTime &time)
+{
+    return QLocale::c().toString(time, QStringLiteral("hh:mmAP"));
 }
 
 QString pageHeaderLine(const QString &application, const QString &title, const QDateTime &time,

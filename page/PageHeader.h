@@ -19,6 +19,9 @@ QString pageHeaderLine(const QString &application, const QString &title, const Q
 
 /// A date and time such as "Mar 05, 2024  02:07PM", in English on every machine.
 QString pageHeaderDate(const QDateTime &time);
+/// Its parts: "Mar 05, 2024" and "02:07PM".
+QString pageHeaderDay(const QDateTime &time);
+QString pageHeaderHour(const QDateTime &time);
 
 /// Whether a line, without its line end, is a page header, in whatever language it was written: it ends with the date, the
 /// label of the page number and the number.

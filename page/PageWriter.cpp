@@ -1,5 +1,7 @@
 #include "PageWriter.h"
 
+#include "PageMark.h"
+
 #include <QByteArrayView>
 
 #include <cstdint>
@@ -231,9 +233,8 @@ void PageWriter::skipLines(qint64 count)
 }
 
 template <typename View>
-void PageWriter::writeTextLine(View text, int linesBefore, int linesAfter, int style)
+void PageWriter::writeTextLine(View text, int linesAfter, int style)
 {
-    skipLines(linesBefore);
     writeText(text, style);
     if (linesAfter != 0) {
         lineFeed(1);
@@ -244,18 +245,45 @@ void PageWriter::writeTextLine(View text, int linesBefore, int linesAfter, int s
 
 void PageWriter::writeLine(QStringView text, int linesBefore, int linesAfter, int style)
 {
-    writeTextLine(text, linesBefore, linesAfter, style);
+    skipLines(linesBefore);
+    writeTextLine(text, linesAfter, style);
 }
 
 void PageWriter::writeLine(QLatin1StringView text, int linesBefore, int linesAfter, int style)
 {
-    writeTextLine(text, linesBefore, linesAfter, style);
+    skipLines(linesBefore);
+    writeTextLine(text, linesAfter, style);
+}
+
+bool PageWriter::isNumbered(QStringView text) const
+{
+    return hasPageMarks_ && text.contains(pageMark);
+}
+
+void PageWriter::writeNumberedLine(QStringView text, qsizetype marked, int linesBefore, int linesAfter, int style)
+{
+    skipLines(linesBefore); // which may begin the page that counts
+    if (!isNumbered(text.first(marked))) {
+        writeTextLine(text, linesAfter, style);
+        return;
+    }
+    const QString numbered = withPageNumber(text.first(marked), pageNumber_).append(text.sliced(marked));
+    writeTextLine(QStringView(numbered), linesAfter, style);
+}
+
+void PageWriter::writeHeadingText()
+{
+    if (isNumbered(heading_.text)) {
+        write(withPageNumber(heading_.text, pageNumber_), 0);
+    } else {
+        write(heading_.text, 0);
+    }
 }
 
 void PageWriter::writeHeading()
 {
     lineFeed(heading_.linesBefore);
-    write(heading_.text, 0);
+    writeHeadingText();
     lineFeed(heading_.linesAfter);
     noteChange();
 }
@@ -269,7 +297,7 @@ void PageWriter::writeHeader()
     lineCount_ += lineFeeds;
     write(headerLine_ + QStringLiteral("%1").arg(pageNumber_, 3), 0);
     lineFeed(qint64(heading_.linesBefore) + headerGap);
-    write(heading_.text, 0);
+    writeHeadingText();
     lineFeed(heading_.linesAfter);
     noteChange();
 }

@@ -96,6 +96,9 @@ public:
     bool headerFlag() const { return headerFlag_; }
     /// The header line without its page number, which every page adds.
     void setHeaderLine(const QString &line) { headerLine_ = line; }
+    /// Whether `pageMark` in headings, and where `writeNumberedLine` looks for it, stands for the number of the page.
+    void setPageMarks(bool on) { hasPageMarks_ = on; }
+    bool hasPageMarks() const { return hasPageMarks_; }
     void setHeading(PageHeading heading) { heading_ = std::move(heading); }
     const PageHeading &heading() const { return heading_; }
 
@@ -115,6 +118,9 @@ public:
     /// line stays open.
     void writeLine(QStringView text, int linesBefore, int linesAfter, int style);
     void writeLine(QLatin1StringView text, int linesBefore, int linesAfter, int style);
+    /// The same with the number of the page that the line is on in the place of the page marks, which are looked for in the
+    /// first `marked` characters.
+    void writeNumberedLine(QStringView text, qsizetype marked, int linesBefore, int linesAfter, int style);
     /// Ends the page without looking at what is left of it, and begins the next one.
     void breakPage();
     /// What `newPage` does before anything is written.
@@ -135,7 +141,9 @@ private:
     template <typename View>
     bool tellWritten(View text, int style);
     template <typename View>
-    void writeTextLine(View text, int linesBefore, int linesAfter, int style);
+    void writeTextLine(View text, int linesAfter, int style);
+    bool isNumbered(QStringView text) const;
+    void writeHeadingText();
 
     void notePageStart();
     void takeBack(qint64 size)
@@ -160,6 +168,7 @@ private:
     int pageNumber_ = 0;
     int linesPerPage_ = defaultLinesPerPage;
     bool headerFlag_ = false;
+    bool hasPageMarks_ = false;
     QString headerLine_;
     PageHeading heading_;
 };

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "WidestText.h"
+
 #include <QString>
 #include <QtGlobal>
 
@@ -19,17 +21,22 @@ struct ValueCount
 /// What a column of a table, or a line of a block, does not show as it is.
 struct ColumnRemarks
 {
-    QString variable;     ///< the name of the variable that the column shows
-    ValueCount tooWide;   ///< values wider than the column, which is then wider, or shows "#"
-    ValueCount missing;   ///< values that are not there and show as 0
-    ValueCount blank;     ///< numbers that are not there and show as blanks, as asked for
-    ValueCount notFinite; ///< values that are infinite or not-a-number
+    QString variable;      ///< the name of the variable that the column shows
+    ValueCount tooWide;    ///< values wider than the column, which is then wider, or shows "#"
+    ValueCount missing;    ///< values that are not there and show as 0
+    ValueCount blank;      ///< numbers that are not there and show as blanks, as asked for
+    ValueCount notFinite;  ///< values that are infinite or not-a-number
+    WidestText widest;     ///< the widest value, where it is asked for
+    quint64 widestRow = 0; ///< of the table, from 1; 0 for none
+    qint64 widestLine = 0; ///< of the report, from 1
 };
 
 /// What the table or block that was written last does not show as it is, by its fields.
 struct DataRemarks
 {
     std::vector<ColumnRemarks> columns; ///< one for each field, in their order
+    quint64 rows = 0;                   ///< how many were written
+    bool measures = false;              ///< whether the widest value of each column is asked for
 
     /// Counts a value. @param row  from 0
     void add(ValueCount &count, quint64 row)
@@ -38,6 +45,13 @@ struct DataRemarks
             count.firstRow = row + 1;
             hasNew_ = true;
         }
+    }
+    /// Says that the widest value of a column is in a row. @param row  from 0
+    void addWidest(ColumnRemarks &column, quint64 row)
+    {
+        column.widestRow = row + 1;
+        column.widestLine = 0;
+        hasNew_ = true;
     }
     /// Says which line of the report the row is in that was added last.
     void setLine(qint64 line)
@@ -54,6 +68,7 @@ private:
             for (ValueCount *count : {&column.tooWide, &column.missing, &column.blank, &column.notFinite}) {
                 count->firstLine = count->count != 0 && count->firstLine == 0 ? line : count->firstLine;
             }
+            column.widestLine = column.widestRow != 0 && column.widestLine == 0 ? line : column.widestLine;
         }
         hasNew_ = false;
     }

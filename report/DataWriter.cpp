@@ -24,11 +24,13 @@ std::vector<FieldFormatter> formattersOf(const UXmlReportTable &table)
     return fields;
 }
 
+/// Remarks without any yet, which ask for what the earlier ones do.
 /// @param record  a table or a block
 template <typename Record>
-DataRemarks remarksFor(const Record &record)
+DataRemarks remarksFor(const Record &record, const DataRemarks &earlier)
 {
     DataRemarks remarks;
+    remarks.measures = earlier.measures;
     remarks.columns.resize(static_cast<std::size_t>(record.GetFieldsCount()));
     for (int i = 0; i < record.GetFieldsCount(); ++i) {
         remarks.columns[static_cast<std::size_t>(i)].variable = record.GetField(i).VariableName;
@@ -57,7 +59,8 @@ void DataWriter::writeBlock(const UXmlReportBlock &block, const UDataObject &obj
 {
     page_.skipLines(linesBefore);
     if (remarks != nullptr) {
-        *remarks = remarksFor(block);
+        *remarks = remarksFor(block, *remarks);
+        remarks->rows = 1;
     }
     for (int i = 0; i < block.GetFieldsCount(); ++i) {
         const sXmlReportField field = block.GetField(i);
@@ -70,16 +73,19 @@ void DataWriter::writeBlock(const UXmlReportBlock &block, const UDataObject &obj
         row_.append(field.Label);
         row_.append(options_.separator);
         const std::size_t start = row_.size();
-        const Shown shown = formatter.append(row_, options_, entry->kind(), entry->GetData(), QStringView());
+        ColumnRemarks *about = remarks != nullptr ? &remarks->columns[static_cast<std::size_t>(i)] : nullptr;
+        WidestText *widest = about != nullptr && remarks->measures ? &about->widest : nullptr;
+        const Shown shown = formatter.append(row_, options_, entry->kind(), entry->GetData(), QStringView(), widest);
         // No column follows that a wide value would move: only what shows as "#" is lost.
-        if (remarks != nullptr && (shown != Shown::TooWide || options_.printHash)) {
-            addShown(*remarks, remarks->columns[static_cast<std::size_t>(i)], shown, 0);
+        if (about != nullptr && (shown != Shown::TooWide || options_.printHash)) {
+            addShown(*remarks, *about, shown, 0);
         }
         row_.trim(start);
-        if (!page_.losesNothing([this] { page_.writeLine(row_.view(), 0, 1, 0); })) {
+        if (!page_.losesNothing([&] { page_.writeNumberedLine(row_.view(), field.Label.size(), 0, 1, 0); })) {
             break;
         }
-        if (remarks != nullptr) {
+        if (about != nullptr) {
+            remarks->addWidest(*about, 0);
             remarks->setLine(page_.lineCount());
         }
     }
@@ -104,7 +110,7 @@ void DataWriter::writeTable(const UXmlReportTable &table, UDataObjectList &list,
     }
     DataRemarks unwanted;
     DataRemarks &remarks = layout.remarks != nullptr ? *layout.remarks : unwanted;
-    remarks = remarksFor(table);
+    remarks = remarksFor(table, remarks);
     writeRows(table, list, remarks);
     endOutput(layout.linesAfter);
 }
@@ -138,6 +144,7 @@ void DataWriter::writeRows(const UXmlReportTable &table, UDataObjectList &list, 
     for (std::size_t index = 1; object != nullptr && page_.losses() == losses; ++index) {
         // The row is complete before the next object is asked for: a list may hold one object at a time.
         formatRow(fields, *object, index - 1, remarks);
+        remarks.rows = index;
         object = list.GetAt(index);
         if (object != nullptr) {
             page_.writeLine(row_.view(), 0, 1, 0);
@@ -169,15 +176,21 @@ void DataWriter::formatRow(const std::vector<FieldFormatter> &fields, const UDat
         case FieldMarker::Filler: field.append(row_, options_, ValueKind::None, nullptr, suffix); break;
         case FieldMarker::None: {
             const UDictEntry *entry = object.Find(field.id());
+            WidestText *const widest = remarks.measures ? &about.widest : nullptr;
+            const qsizetype widestBefore = about.widest.width;
             if (entry != nullptr) {
-                addShown(remarks, about, field.append(row_, options_, entry->kind(), entry->GetData(), suffix), row);
+                addShown(remarks, about, field.append(row_, options_, entry->kind(), entry->GetData(), suffix, widest),
+                         row);
             } else {
-                field.append(row_, options_, ValueKind::None, nullptr, suffix);
+                field.append(row_, options_, ValueKind::None, nullptr, suffix, widest);
                 if (field.showsZeroForNone(options_)) {
                     remarks.add(about.missing, row);
                 } else if (field.showsZeroForNone(FormatOptions())) {
                     remarks.add(about.blank, row);
                 }
+            }
+            if (about.widest.width != widestBefore) {
+                remarks.addWidest(about, row);
             }
             row_.append(options_.separator);
             break;

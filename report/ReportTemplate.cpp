@@ -37,6 +37,7 @@ bool ReportTemplate::load(const QStringList &paths, const QString &templateName,
     table_.reset();
     block_.reset();
     template_ = std::make_unique<UXmlReportTpl>();
+    template_->SetLabelText(labelText);
     const auto hasTemplate = [&](const QString &path) { return template_->LoadTemplate(path, templateName); };
     if (std::none_of(paths.begin(), paths.end(), hasTemplate)) {
         return false;

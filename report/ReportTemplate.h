@@ -29,7 +29,8 @@ public:
     bool zeroBlank = false;               ///< values of zero show as blanks
     static inline bool printHash = false; ///< values wider than their column show as "#": one setting for all reports
     std::optional<bool> ownPrintHash;     ///< instead of that; nothing for none
-    DataRemarks *remarks = nullptr; ///< receives what a table does not show as it is; null when they are not wanted
+    DataRemarks *remarks = nullptr;     ///< receives what a table does not show as it is; null when they are not wanted
+    UXmlReportTpl::LabelText labelText; ///< what is shown of the labels of templates that are loaded; null for all
 
     /// Loads a template from the first of the files that has it, and then the table and the block unless their names are
     /// empty. @return false when one of them cannot be loaded

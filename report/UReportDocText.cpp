@@ -129,7 +129,8 @@ bool UReportDoc::NewPage(int linesNeeded)
 
 void UReportDoc::WriteLine(const QString &text, int linesBefore, int linesAfter, int style)
 {
-    parts_->page.losesNothing([&] { parts_->page.writeLine(text, linesBefore, linesAfter, style); });
+    parts_->page.losesNothing(
+        [&] { parts_->page.writeNumberedLine(text, text.size(), linesBefore, linesAfter, style); });
 }
 
 void UReportDoc::SetHeading(const QString &heading, int linesBefore, int linesAfter)

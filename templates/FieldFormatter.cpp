@@ -70,7 +70,7 @@ FieldFormatter::FieldFormatter(const sXmlReportField &field)
 {}
 
 Shown FieldFormatter::append(TextBuffer &out, const FormatOptions &options, ValueKind kind, const void *value,
-                             QStringView suffix) const
+                             QStringView suffix, WidestText *widest) const
 {
     if (marker_ == FieldMarker::Filler) {
         out.appendFill(columnOf(width_), u' ');
@@ -84,6 +84,9 @@ Shown FieldFormatter::append(TextBuffer &out, const FormatOptions &options, Valu
     const std::size_t start = out.size();
     appendValue(out, options, input, suffix);
     const std::size_t length = out.size() - start;
+    if (widest != nullptr) {
+        widest->take(ownText(out.from(start)));
+    }
     if (options.printHash && length > columnOf(width_)) {
         out.truncate(start);
         out.appendFill(columnOf(width_), u'#');
@@ -239,6 +242,17 @@ void FieldFormatter::appendThickness(TextBuffer &out, double value) const
         return;
     }
     appendNumber(out, value / 100, decimals_);
+}
+
+/// The text of a value without the blanks that fill its column. Those of a text from the data are its own.
+QStringView FieldFormatter::ownText(QStringView text) const
+{
+    switch (type_) {
+    case VARIABLE_TEXT:
+    case VARIABLE_NAME:
+    case VARIABLE_NUMBER: return text;
+    default: return text.trimmed();
+    }
 }
 
 /// Fills the column. A text wider than its column stays whole: no digit is ever cut off.

@@ -4,6 +4,7 @@
 #include "TextBuffer.h"
 #include "UJobSettings.h"
 #include "ValueKind.h"
+#include "WidestText.h"
 #include "sXmlReportField.h"
 
 #include <QStringView>
@@ -42,9 +43,10 @@ public:
     /// Appends a value's text, fitted to the field's column.
     /// @param kind    what `value` points to; `None` and any other number count as 0, false or an empty text
     /// @param suffix  "+" shows an offset with its sign, anything else with "L" or "R" after it
+    /// @param widest  takes the text, without the blanks that fill the column, where it is the widest; null for none
     /// @return how it shows; a column without a width, or in the spreadsheet form, has room for any text
-    Shown append(TextBuffer &out, const FormatOptions &options, ValueKind kind, const void *value,
-                 QStringView suffix) const;
+    Shown append(TextBuffer &out, const FormatOptions &options, ValueKind kind, const void *value, QStringView suffix,
+                 WidestText *widest = nullptr) const;
 
 private:
     enum class Align
@@ -60,6 +62,7 @@ private:
     void appendBearing(TextBuffer &out, const UJobSettings &settings, double value) const;
     void appendOffset(TextBuffer &out, const UJobSettings &settings, double value, bool withSign) const;
     void appendThickness(TextBuffer &out, double value) const;
+    QStringView ownText(QStringView text) const;
     void fit(TextBuffer &out, std::size_t start, char16_t separator) const;
     void centre(TextBuffer &out, std::size_t start) const;
 

@@ -21,14 +21,24 @@ constexpr std::array<QStringView, 25> elementNames = {
 constexpr qsizetype longestTag = 200;
 constexpr qsizetype longestQuote = 40;
 
+} // namespace
+
+QStringList elementNameList()
+{
+    QStringList names;
+    for (const QStringView name : elementNames) {
+        names.append(name.toString());
+    }
+    return names;
+}
+
 bool isElementName(QStringView name)
 {
     return std::any_of(elementNames.begin(), elementNames.end(),
                        [name](QStringView known) { return equalFolded(known, name); });
 }
 
-/// What is between "<" and ">" of the tag at a position; empty when there is no such text.
-QStringView tagText(QStringView text, qsizetype at)
+QStringView tagTextAt(QStringView text, qsizetype at)
 {
     const QStringView rest = text.sliced(at + 1).first(std::min(longestTag, text.size() - at - 1));
     const auto *const end =
@@ -36,8 +46,7 @@ QStringView tagText(QStringView text, qsizetype at)
     return end != rest.end() && *end == u'>' ? QStringView(rest.begin(), end) : QStringView();
 }
 
-/// The name in a tag's text, without what surrounds it.
-QStringView nameIn(QStringView tag)
+QStringView nameInTag(QStringView tag)
 {
     qsizetype begin = 0;
     while (begin < tag.size() && (tag[begin] == u'/' || tag[begin].isSpace())) {
@@ -51,8 +60,6 @@ QStringView nameIn(QStringView tag)
     }
     return tag.sliced(begin, end - begin);
 }
-
-} // namespace
 
 QString elementName(QStringView tag)
 {
@@ -75,8 +82,8 @@ std::vector<TagRemark> findIgnoredTags(const ScanText &file)
             commentEnd = end < 0 ? text.size() : end;
             continue;
         }
-        const QStringView tag = tagText(text, at);
-        const QStringView name = nameIn(tag);
+        const QStringView tag = tagTextAt(text, at);
+        const QStringView name = nameInTag(tag);
         if (name.isEmpty() || !isElementName(name)) {
             continue;
         }

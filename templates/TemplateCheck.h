@@ -23,9 +23,18 @@ struct TemplateRemark
 /// A width or a number of decimals above this counts as a mistake.
 inline constexpr qint32 widestColumn = 32767;
 
+/// What of a file is checked, and for which use.
+struct TemplateCheckScope
+{
+    QString name =
+        QString(); ///< of the one template that is checked, the last one of the name; empty for the whole file
+    bool hasPlaceholders = false; ///< labels have placeholders, so that they are not as wide as they look
+};
+
 /// Reads every template of a file as the module reads it and says what the module passes over in silence, in the order
 /// of the file. Where memory ends, the one remark is an error that says so.
-KAREPORT_EXPORT std::vector<TemplateRemark> checkTemplates(const TemplateFile &file);
+KAREPORT_EXPORT std::vector<TemplateRemark> checkTemplates(const TemplateFile &file,
+                                                           const TemplateCheckScope &scope = {});
 
 /// The first thing in a file that keeps a whole template from being read; nothing when there is none. That memory has ended
 /// while it was looked for is one.

@@ -38,7 +38,13 @@ FieldFormat parseFieldFormat(QStringView format)
 
 sXmlReportField tableField(const FieldElement &element)
 {
+    return tableField(element, element.label.value.text());
+}
+
+sXmlReportField tableField(const FieldElement &element, const QString &label)
+{
     sXmlReportField field = fieldOf(element);
+    field.Label = label;
     if (element.format.value.isEmpty() && equalFolded(field.VariableName, u"FLAG")) {
         field.Width = 1;
     }

@@ -17,6 +17,8 @@ struct FieldFormat
 FieldFormat parseFieldFormat(QStringView format);
 
 /// The field of a table: at least as wide as its label, aligned left, centred or right.
+/// @param label  shown instead of the element's
+sXmlReportField tableField(const FieldElement &element, const QString &label);
 sXmlReportField tableField(const FieldElement &element);
 /// The field of a block: as wide as its format says, aligned left or right.
 sXmlReportField blockField(const FieldElement &element);

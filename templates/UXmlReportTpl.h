@@ -13,6 +13,7 @@
 #include <QString>
 #include <QStringList>
 
+#include <functional>
 #include <memory>
 #include <unordered_map>
 #include <vector>
@@ -38,6 +39,12 @@ public:
     /// @return false when the file cannot be read, the name is empty or the file has no such template. The object then
     ///         holds nothing, the list of templates included.
     bool LoadTemplate(const QString &fileName, const QString &templateName);
+
+    /// Makes the text that is shown of a label. @param title  of the template
+    using LabelText = std::function<QString(const QString &label, const QString &title)>;
+    /// Has templates that are read from now on show other texts than the labels of their fields; null for the labels
+    /// themselves. A column is at least as wide as what is shown.
+    void SetLabelText(LabelText textOf) { labelText_ = std::move(textOf); }
 
     /// The title of the chosen template: of several with its name, the first one's; "" when no template has the name.
     QString GetTemplateTitle() const;
@@ -93,6 +100,7 @@ private:
     void MergeBlockWithDictionary();
     void MergeSortWithDictionary();
     void CleanData(bool keepText);
+    QString shownLabel(const QString &label) const;
 
     struct VariableInfo
     {
@@ -107,6 +115,7 @@ private:
 
     std::unique_ptr<kareport::ScanText> xml_; ///< after loading, the body of the chosen template
     QString name_;
+    LabelText labelText_;
     QStringList tableNames_;
     QStringList dictionaryNames_;
     QStringList blockNames_;

@@ -53,11 +53,18 @@ bool UXmlReportTpl::ReadTables()
         sXmlReportTable table{element.name.value.text(), element.use.value.text(), {}};
         table.Fields.reserve(element.fields.size());
         std::transform(element.fields.begin(), element.fields.end(), std::back_inserter(table.Fields),
-                       kareport::tableField);
+                       [this](const kareport::FieldElement &field) {
+                           return kareport::tableField(field, shownLabel(field.label.value.text()));
+                       });
         tableNames_.append(table.Name);
         tables_.push_back(std::move(table));
     }
     return true;
+}
+
+QString UXmlReportTpl::shownLabel(const QString &label) const
+{
+    return labelText_ ? labelText_(label, GetTemplateTitle()) : label;
 }
 
 bool UXmlReportTpl::ReadBlocks()
@@ -67,6 +74,9 @@ bool UXmlReportTpl::ReadBlocks()
         block.Fields.reserve(element.fields.size());
         std::transform(element.fields.begin(), element.fields.end(), std::back_inserter(block.Fields),
                        kareport::blockField);
+        for (sXmlReportField &field : block.Fields) {
+            field.Label = shownLabel(field.Label);
+        }
         blockNames_.append(block.Name);
         blocks_.push_back(std::move(block));
     }

@@ -14,6 +14,16 @@
         <translation>meinten Sie "%1"?</translation>
     </message>
     <message>
+        <location filename="../host/app/NearestName.cpp"/>
+        <source>none</source>
+        <translation>keine</translation>
+    </message>
+    <message>
+        <location filename="../host/app/NearestName.cpp"/>
+        <source>one of %1 was expected</source>
+        <translation>einer dieser Werte wurde erwartet: %1</translation>
+    </message>
+    <message>
         <location filename="../host/app/ReplaceFile.cpp"/>
         <source>not all of it could be written</source>
         <translation>nicht alles konnte geschrieben werden</translation>
@@ -69,119 +79,174 @@
         <translation>„%1“ entfällt mit dem verkürzten schließenden Tag von %2</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateChecker.cpp"/>
         <source>no template was read: a &lt;ReportTemplate&gt; element was expected</source>
         <translation>es wurde keine Vorlage gelesen: ein Element &lt;ReportTemplate&gt; wurde erwartet</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateChecker.cpp"/>
+        <source>the text "%1" is in no element: nobody reads it</source>
+        <translation>der Text "%1" steht in keinem Element: er wird nicht gelesen</translation>
+    </message>
+    <message>
+        <location filename="../templates/TemplateChecker.cpp"/>
+        <source>this text is in no template: %1 characters in %2 lines are not read</source>
+        <translation>dieser Text steht in keiner Vorlage: %1 Zeichen in %2 Zeilen werden nicht gelesen</translation>
+    </message>
+    <message>
+        <location filename="../templates/TemplateChecker.cpp"/>
+        <source>no template follows: the last %1 characters, in %2 lines, are not read</source>
+        <translation>es folgt keine Vorlage mehr: die letzten %1 Zeichen in %2 Zeilen werden nicht gelesen</translation>
+    </message>
+    <message>
+        <location filename="../templates/TemplateChecker.cpp"/>
+        <source>unknown element %1: nobody reads it</source>
+        <translation>unbekanntes Element %1: es wird nicht gelesen</translation>
+    </message>
+    <message>
+        <location filename="../templates/TemplateChecker.cpp"/>
+        <source>unknown element %1: %2</source>
+        <translation>unbekanntes Element %1: %2</translation>
+    </message>
+    <message>
+        <location filename="../templates/TemplateChecker.cpp"/>
         <source>%1 is read although it is in a comment</source>
         <translation>%1 wird gelesen, obwohl es in einem Kommentar steht</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateChecker.cpp"/>
         <source>%1 is not a tag: a tag has no blanks and no attributes</source>
         <translation>%1 ist kein Tag: ein Tag hat weder Leerzeichen noch Attribute</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateChecker.cpp"/>
         <source>the template has no &lt;Name&gt;, so it cannot be chosen</source>
         <translation>die Vorlage hat keinen &lt;Name&gt; und kann daher nicht gewählt werden</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateChecker.cpp"/>
         <source>a template named %1 comes before this one: the last one of a name is read</source>
         <translation>eine Vorlage namens %1 steht schon davor: von gleichnamigen wird die letzte gelesen</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateChecker.cpp"/>
         <source>the template's own &lt;Name&gt; must come before %1: this one was taken for it</source>
         <translation>der eigene &lt;Name&gt; der Vorlage muss vor %1 stehen: dieser hier wurde dafür gehalten</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateChecker.cpp"/>
         <source>the sort key %1 is not in the dictionary %2</source>
         <translation>der Sortierschlüssel %1 steht nicht im Wörterbuch %2</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateChecker.cpp"/>
         <source>no &lt;Separator&gt;: the columns are separated by the character 0</source>
         <translation>kein &lt;Separator&gt;: zwischen den Spalten steht das Zeichen mit dem Code 0</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>the dictionary has no &lt;DictionaryName&gt;</source>
         <translation>das Wörterbuch hat keinen &lt;DictionaryName&gt;</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
+        <source>a dictionary named %1 comes before this one: the variables of both count together</source>
+        <translation>vor diesem steht ein Wörterbuch namens %1: die Variablen beider zählen zusammen</translation>
+    </message>
+    <message>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>unknown type %1: the variable %2 is left out</source>
         <translation>unbekannter Typ %1: die Variable %2 wird ausgelassen</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>the identifier %1 counts as %2: a whole number was expected</source>
         <translation>die Kennung %1 gilt als %2: eine ganze Zahl wurde erwartet</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>the variable %1 is in the dictionary twice: the last one counts</source>
         <translation>die Variable %1 steht zweimal im Wörterbuch: die letzte gilt</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>the variables %1 and %2 share the identifier %3</source>
         <translation>die Variablen %1 und %2 haben dieselbe Kennung %3</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>the table has no &lt;Name&gt;</source>
         <translation>die Tabelle hat keinen &lt;Name&gt;</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>the block has no &lt;Name&gt;</source>
         <translation>der Block hat keinen &lt;Name&gt;</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>there is no dictionary named %1: %2 cannot be written</source>
         <translation>es gibt kein Wörterbuch namens %1: %2 kann nicht geschrieben werden</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>%1 has no fields</source>
         <translation>%1 hat keine Felder</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
-        <source>the dictionary has no variable %1: the column cannot be filled</source>
-        <translation>das Wörterbuch hat keine Variable %1: die Spalte kann nicht gefüllt werden</translation>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
+        <source>a table named %1 comes before this one: the first one of a name is written</source>
+        <translation>vor dieser steht eine Tabelle namens %1: die erste eines Namens wird geschrieben</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
-        <source>the dictionary has no variable %1: the line repeats the value before it</source>
-        <translation>das Wörterbuch hat keine Variable %1: die Zeile wiederholt den Wert davor</translation>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
+        <source>a block named %1 comes before this one: the first one of a name is written</source>
+        <translation>vor diesem steht ein Block namens %1: der erste eines Namens wird geschrieben</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>the format %1 is beyond %2 characters</source>
         <translation>das Format %1 geht über %2 Zeichen hinaus</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
+        <source>the format %1 counts as %2.%3: a width such as 12, or a width and decimals such as 12.3, was expected</source>
+        <translation>das Format %1 gilt als %2.%3: eine Breite wie 12 oder eine Breite mit Nachkommastellen wie 12.3 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
+        <source>the dictionary has no variable %1: the column cannot be filled</source>
+        <translation>das Wörterbuch hat keine Variable %1: die Spalte kann nicht gefüllt werden</translation>
+    </message>
+    <message>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
+        <source>the dictionary has no variable %1: the line repeats the value before it</source>
+        <translation>das Wörterbuch hat keine Variable %1: die Zeile wiederholt den Wert davor</translation>
+    </message>
+    <message>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>the label %1 is wider than its column of %2: the column takes its width</source>
         <translation>die Beschriftung %1 ist breiter als ihre Spalte mit %2 Zeichen: die Spalte wird so breit wie die Beschriftung</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>the alignment %1 counts as LEFT</source>
         <translation>die Ausrichtung %1 gilt als LEFT</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>%1 is printed unchanged</source>
         <translation>%1 wird unverändert gedruckt</translation>
+    </message>
+    <message>
+        <location filename="../page/Placeholders.cpp"/>
+        <source>"%1" begins a placeholder that does not end: "}" was expected, or "{{" for a brace</source>
+        <translation>"%1" beginnt einen Platzhalter, der nicht endet: "}" wurde erwartet, oder "{{" für eine Klammer</translation>
+    </message>
+    <message>
+        <location filename="../page/Placeholders.cpp"/>
+        <source>unknown placeholder %1: %2</source>
+        <translation>unbekannter Platzhalter %1: %2</translation>
     </message>
     <message>
         <location filename="../formats/pdf/PdfExport.cpp"/>
@@ -862,11 +927,6 @@
     </message>
     <message>
         <location filename="../sources/ColumnBinding.cpp"/>
-        <source>one of %1 was expected</source>
-        <translation>einer dieser Werte wurde erwartet: %1</translation>
-    </message>
-    <message>
-        <location filename="../sources/ColumnBinding.cpp"/>
         <source>there is no column %1: one of 1 to %2 was expected</source>
         <translation>es gibt keine Spalte %1: erwartet wurde eine von 1 bis %2</translation>
     </message>
@@ -1215,11 +1275,6 @@
         <location filename="../sources/json/JsonKeys.cpp"/>
         <source>no key of the objects is a variable of the dictionary: there are %1</source>
         <translation>kein Schlüssel der Objekte ist eine Variable des Wörterbuchs: vorhanden sind %1</translation>
-    </message>
-    <message>
-        <location filename="../sources/json/JsonKeys.cpp"/>
-        <source>none</source>
-        <translation>keine</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlComparison.cpp"/>
@@ -1973,8 +2028,8 @@
     </message>
     <message>
         <location filename="../jobs/JobSteps.cpp"/>
-        <source>the template has no %1 named "%2": one of %3 was expected</source>
-        <translation>%1 „%2“ fehlt in der Vorlage; vorhanden: %3</translation>
+        <source>the template has no %1 named "%2": %3</source>
+        <translation>die Vorlage hat nichts namens "%2" (%1): %3</translation>
     </message>
     <message>
         <location filename="../jobs/JobSteps.cpp"/>
@@ -2008,8 +2063,8 @@
     </message>
     <message>
         <location filename="../jobs/JobStepsReader.cpp"/>
-        <source>there is no data set named "%1" in the job</source>
-        <translation>im Auftrag gibt es keinen Datenbestand namens „%1“</translation>
+        <source>there is no data set named "%1" in the job: %2</source>
+        <translation>im Auftrag gibt es keinen Datensatz namens "%1": %2</translation>
     </message>
     <message>
         <location filename="../jobs/JobStepsReader.cpp"/>
@@ -2173,13 +2228,99 @@
     </message>
     <message>
         <location filename="../jobs/TemplateSource.cpp"/>
-        <source>there is no template named "%1": one of %2 was expected</source>
-        <translation>es gibt keine Vorlage namens „%1“; vorhanden: %2</translation>
+        <source>there is no template named "%1": %2</source>
+        <translation>es gibt keine Vorlage namens "%1": %2</translation>
     </message>
     <message>
         <location filename="../jobs/ValuesData.cpp"/>
         <source>an object or a list of objects was expected</source>
         <translation>ein Objekt oder eine Liste von Objekten wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckCommand.cpp"/>
+        <source>there is not enough memory for this file</source>
+        <translation>der Speicher reicht für diese Datei nicht aus</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckCommand.cpp"/>
+        <source>kareport: "%1" could not be written: %2</source>
+        <translation>kareport: „%1“ konnte nicht geschrieben werden: %2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckCommand.cpp"/>
+        <source>standard input is one job: - was expected once</source>
+        <translation>die Standardeingabe ist ein einziger Auftrag: - wurde einmal erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckCommand.cpp"/>
+        <source>--notes "%1": the name of a file was expected</source>
+        <translation>--notes "%1": der Name einer Datei wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckCommand.cpp"/>
+        <source>--notes "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
+        <translation>--notes "%1" ist eine Datei für mehrere Aufträge: ein Name mit {} wurde erwartet, was für den Namen der Auftragsdatei steht</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckCommand.cpp"/>
+        <source>kareport: stopped; nothing more was checked</source>
+        <translation>kareport: abgebrochen; mehr wurde nicht geprüft</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>%1 too wide</source>
+        <translation>%1 zu breit</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>label too wide</source>
+        <translation>Beschriftung zu breit</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>fits</source>
+        <translation>passt</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>%1: table "%2", %3 rows of the data "%4"</source>
+        <translation>%1: Tabelle "%2", %3 Reihen der Daten "%4"</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>%1: block "%2", %3 row of the data "%4"</source>
+        <translation>%1: Block "%2", %3 Reihe der Daten "%4"</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>field</source>
+        <translation>Feld</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>label</source>
+        <comment>Text over a column</comment>
+        <translation>Beschriftung</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>width</source>
+        <translation>Breite</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>widest</source>
+        <translation>breitester</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>row</source>
+        <translation>Reihe</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>value</source>
+        <translation>Wert</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CommandLineJob.cpp"/>
@@ -2195,11 +2336,6 @@
         <location filename="../apps/kareport/CommandLineJob.cpp"/>
         <source>kareport: stopped; nothing was written</source>
         <translation>kareport: abgebrochen; es wurde nichts geschrieben</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CommandLineJob.cpp"/>
-        <source>kareport: "%1" could not be written: %2</source>
-        <translation>kareport: „%1“ konnte nicht geschrieben werden: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CommandOutputs.cpp"/>
@@ -2345,16 +2481,6 @@
         <location filename="../apps/kareport/RenderCommand.cpp"/>
         <source>-o "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
         <translation>-o "%1" ist eine Datei für mehrere Aufträge: ein Name mit {} wurde erwartet; {} steht für den Namen der Auftragsdatei</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/RenderCommand.cpp"/>
-        <source>--notes "%1": the name of a file was expected</source>
-        <translation>--notes "%1": der Name einer Datei wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/RenderCommand.cpp"/>
-        <source>--notes "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
-        <translation>--notes "%1" ist eine Datei für mehrere Aufträge: ein Name mit {} wurde erwartet, was für den Namen der Auftragsdatei steht</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>

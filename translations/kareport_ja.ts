@@ -14,6 +14,16 @@
         <translation>"%1" のことですか?</translation>
     </message>
     <message>
+        <location filename="../host/app/NearestName.cpp"/>
+        <source>none</source>
+        <translation>なし</translation>
+    </message>
+    <message>
+        <location filename="../host/app/NearestName.cpp"/>
+        <source>one of %1 was expected</source>
+        <translation>次のいずれかが必要です: %1</translation>
+    </message>
+    <message>
         <location filename="../host/app/ReplaceFile.cpp"/>
         <source>not all of it could be written</source>
         <translation>すべてを書き込むことはできませんでした</translation>
@@ -69,119 +79,174 @@
         <translation>「%1」は %2 の省略形の終了タグとともに無視されます</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateChecker.cpp"/>
         <source>no template was read: a &lt;ReportTemplate&gt; element was expected</source>
         <translation>テンプレートが読み込まれませんでした: &lt;ReportTemplate&gt; 要素が必要です</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateChecker.cpp"/>
+        <source>the text "%1" is in no element: nobody reads it</source>
+        <translation>テキスト "%1" はどの要素の中にもなく、読み込まれません</translation>
+    </message>
+    <message>
+        <location filename="../templates/TemplateChecker.cpp"/>
+        <source>this text is in no template: %1 characters in %2 lines are not read</source>
+        <translation>このテキストはどのテンプレートの中にもありません: %2 行の %1 文字は読み込まれません</translation>
+    </message>
+    <message>
+        <location filename="../templates/TemplateChecker.cpp"/>
+        <source>no template follows: the last %1 characters, in %2 lines, are not read</source>
+        <translation>これより後にテンプレートはありません: 最後の %2 行の %1 文字は読み込まれません</translation>
+    </message>
+    <message>
+        <location filename="../templates/TemplateChecker.cpp"/>
+        <source>unknown element %1: nobody reads it</source>
+        <translation>不明な要素 %1: 読み込まれません</translation>
+    </message>
+    <message>
+        <location filename="../templates/TemplateChecker.cpp"/>
+        <source>unknown element %1: %2</source>
+        <translation>不明な要素 %1: %2</translation>
+    </message>
+    <message>
+        <location filename="../templates/TemplateChecker.cpp"/>
         <source>%1 is read although it is in a comment</source>
         <translation>%1 はコメント内にありますが、読み込まれます</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateChecker.cpp"/>
         <source>%1 is not a tag: a tag has no blanks and no attributes</source>
         <translation>%1 はタグではありません: タグに空白や属性は使えません</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateChecker.cpp"/>
         <source>the template has no &lt;Name&gt;, so it cannot be chosen</source>
         <translation>テンプレートに &lt;Name&gt; がないため、選択できません</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateChecker.cpp"/>
         <source>a template named %1 comes before this one: the last one of a name is read</source>
         <translation>%1 という名前のテンプレートが前にもあります: 同名のものは最後の 1 つが読み込まれます</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateChecker.cpp"/>
         <source>the template's own &lt;Name&gt; must come before %1: this one was taken for it</source>
         <translation>テンプレート自身の &lt;Name&gt; は %1 より前に必要です: この &lt;Name&gt; がテンプレート名とみなされました</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateChecker.cpp"/>
         <source>the sort key %1 is not in the dictionary %2</source>
         <translation>並べ替えキー %1 は辞書 %2 にありません</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateChecker.cpp"/>
         <source>no &lt;Separator&gt;: the columns are separated by the character 0</source>
         <translation>&lt;Separator&gt; がありません: 列の間には文字コード 0 の文字が入ります</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>the dictionary has no &lt;DictionaryName&gt;</source>
         <translation>辞書に &lt;DictionaryName&gt; がありません</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
+        <source>a dictionary named %1 comes before this one: the variables of both count together</source>
+        <translation>%1 という名前の辞書がこの前にあります: 両方の変数が合わせて使われます</translation>
+    </message>
+    <message>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>unknown type %1: the variable %2 is left out</source>
         <translation>不明な型 %1: 変数 %2 は除外されます</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>the identifier %1 counts as %2: a whole number was expected</source>
         <translation>識別子 %1 は %2 とみなされます: 整数が必要です</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>the variable %1 is in the dictionary twice: the last one counts</source>
         <translation>変数 %1 が辞書に 2 回あります: 最後のものが有効です</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>the variables %1 and %2 share the identifier %3</source>
         <translation>変数 %1 と %2 の識別子がどちらも %3 です</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>the table has no &lt;Name&gt;</source>
         <translation>表に &lt;Name&gt; がありません</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>the block has no &lt;Name&gt;</source>
         <translation>ブロックに &lt;Name&gt; がありません</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>there is no dictionary named %1: %2 cannot be written</source>
         <translation>%1 という名前の辞書がありません: %2 は出力できません</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>%1 has no fields</source>
         <translation>%1 にフィールドがありません</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
-        <source>the dictionary has no variable %1: the column cannot be filled</source>
-        <translation>辞書に変数 %1 がありません: この列には値が入りません</translation>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
+        <source>a table named %1 comes before this one: the first one of a name is written</source>
+        <translation>%1 という名前の表がこの前にあります: 同じ名前では最初のものが書き込まれます</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
-        <source>the dictionary has no variable %1: the line repeats the value before it</source>
-        <translation>辞書に変数 %1 がありません: この行には直前の値が繰り返されます</translation>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
+        <source>a block named %1 comes before this one: the first one of a name is written</source>
+        <translation>%1 という名前のブロックがこの前にあります: 同じ名前では最初のものが書き込まれます</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>the format %1 is beyond %2 characters</source>
         <translation>書式 %1 が %2 文字を超えています</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
+        <source>the format %1 counts as %2.%3: a width such as 12, or a width and decimals such as 12.3, was expected</source>
+        <translation>書式 %1 は %2.%3 とみなされます: 12 のような幅、または 12.3 のような幅と小数桁数が必要です</translation>
+    </message>
+    <message>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
+        <source>the dictionary has no variable %1: the column cannot be filled</source>
+        <translation>辞書に変数 %1 がありません: この列には値が入りません</translation>
+    </message>
+    <message>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
+        <source>the dictionary has no variable %1: the line repeats the value before it</source>
+        <translation>辞書に変数 %1 がありません: この行には直前の値が繰り返されます</translation>
+    </message>
+    <message>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>the label %1 is wider than its column of %2: the column takes its width</source>
         <translation>ラベル %1 が列幅 %2 文字を超えています: 列幅はラベルに合わせられます</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>the alignment %1 counts as LEFT</source>
         <translation>配置 %1 は LEFT とみなされます</translation>
     </message>
     <message>
-        <location filename="../templates/TemplateCheck.cpp"/>
+        <location filename="../templates/TemplateCheckerRecords.cpp"/>
         <source>%1 is printed unchanged</source>
         <translation>%1 はそのまま印字されます</translation>
+    </message>
+    <message>
+        <location filename="../page/Placeholders.cpp"/>
+        <source>"%1" begins a placeholder that does not end: "}" was expected, or "{{" for a brace</source>
+        <translation>"%1" で始まるプレースホルダーが閉じられていません: "}"、または括弧そのものを表す "{{" が必要です</translation>
+    </message>
+    <message>
+        <location filename="../page/Placeholders.cpp"/>
+        <source>unknown placeholder %1: %2</source>
+        <translation>不明なプレースホルダー %1: %2</translation>
     </message>
     <message>
         <location filename="../formats/pdf/PdfExport.cpp"/>
@@ -862,11 +927,6 @@
     </message>
     <message>
         <location filename="../sources/ColumnBinding.cpp"/>
-        <source>one of %1 was expected</source>
-        <translation>次のいずれかが必要です: %1</translation>
-    </message>
-    <message>
-        <location filename="../sources/ColumnBinding.cpp"/>
         <source>there is no column %1: one of 1 to %2 was expected</source>
         <translation>列 %1 はありません: 1 から %2 のいずれかが必要です</translation>
     </message>
@@ -1215,11 +1275,6 @@
         <location filename="../sources/json/JsonKeys.cpp"/>
         <source>no key of the objects is a variable of the dictionary: there are %1</source>
         <translation>辞書の変数であるキーがオブジェクトにありません: あるのは %1 です</translation>
-    </message>
-    <message>
-        <location filename="../sources/json/JsonKeys.cpp"/>
-        <source>none</source>
-        <translation>なし</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlComparison.cpp"/>
@@ -1973,8 +2028,8 @@
     </message>
     <message>
         <location filename="../jobs/JobSteps.cpp"/>
-        <source>the template has no %1 named "%2": one of %3 was expected</source>
-        <translation>テンプレートに「%2」という名前の%1がありません。使用できるもの: %3</translation>
+        <source>the template has no %1 named "%2": %3</source>
+        <translation>テンプレートに "%2" という名前の%1がありません: %3</translation>
     </message>
     <message>
         <location filename="../jobs/JobSteps.cpp"/>
@@ -2008,8 +2063,8 @@
     </message>
     <message>
         <location filename="../jobs/JobStepsReader.cpp"/>
-        <source>there is no data set named "%1" in the job</source>
-        <translation>ジョブに「%1」という名前のデータセットがありません</translation>
+        <source>there is no data set named "%1" in the job: %2</source>
+        <translation>ジョブに "%1" という名前のデータセットがありません: %2</translation>
     </message>
     <message>
         <location filename="../jobs/JobStepsReader.cpp"/>
@@ -2173,13 +2228,99 @@
     </message>
     <message>
         <location filename="../jobs/TemplateSource.cpp"/>
-        <source>there is no template named "%1": one of %2 was expected</source>
-        <translation>「%1」という名前のテンプレートがありません。使用できるもの: %2</translation>
+        <source>there is no template named "%1": %2</source>
+        <translation>"%1" という名前のテンプレートはありません: %2</translation>
     </message>
     <message>
         <location filename="../jobs/ValuesData.cpp"/>
         <source>an object or a list of objects was expected</source>
         <translation>オブジェクトまたはオブジェクトのリストが必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckCommand.cpp"/>
+        <source>there is not enough memory for this file</source>
+        <translation>このファイルにはメモリが足りません</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckCommand.cpp"/>
+        <source>kareport: "%1" could not be written: %2</source>
+        <translation>kareport: 「%1」を書き込めませんでした: %2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckCommand.cpp"/>
+        <source>standard input is one job: - was expected once</source>
+        <translation>標準入力は一つのジョブです: - は一度だけ指定できます</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckCommand.cpp"/>
+        <source>--notes "%1": the name of a file was expected</source>
+        <translation>--notes "%1": ファイル名が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckCommand.cpp"/>
+        <source>--notes "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
+        <translation>--notes "%1" は複数のジョブに対して 1 つのファイルです: ジョブファイルの名前を表す {} を含む名前が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckCommand.cpp"/>
+        <source>kareport: stopped; nothing more was checked</source>
+        <translation>kareport: 中止しました。これ以上は検査していません</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>%1 too wide</source>
+        <translation>%1 件が幅を超過</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>label too wide</source>
+        <translation>見出しが幅を超過</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>fits</source>
+        <translation>収まる</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>%1: table "%2", %3 rows of the data "%4"</source>
+        <translation>%1: 表 "%2"、データ "%4" の %3 行</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>%1: block "%2", %3 row of the data "%4"</source>
+        <translation>%1: ブロック "%2"、データ "%4" の %3 行</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>field</source>
+        <translation>フィールド</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>label</source>
+        <comment>Text over a column</comment>
+        <translation>見出し</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>width</source>
+        <translation>幅</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>widest</source>
+        <translation>最大幅</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>row</source>
+        <translation>行</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CheckOutput.cpp"/>
+        <source>value</source>
+        <translation>値</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CommandLineJob.cpp"/>
@@ -2195,11 +2336,6 @@
         <location filename="../apps/kareport/CommandLineJob.cpp"/>
         <source>kareport: stopped; nothing was written</source>
         <translation>kareport: 中断されました。何も書き込まれていません</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CommandLineJob.cpp"/>
-        <source>kareport: "%1" could not be written: %2</source>
-        <translation>kareport: 「%1」を書き込めませんでした: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CommandOutputs.cpp"/>
@@ -2345,16 +2481,6 @@
         <location filename="../apps/kareport/RenderCommand.cpp"/>
         <source>-o "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
         <translation>-o "%1" は複数のジョブに対して 1 つのファイルです: ジョブファイル名を表す {} を含む名前が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/RenderCommand.cpp"/>
-        <source>--notes "%1": the name of a file was expected</source>
-        <translation>--notes "%1": ファイル名が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/RenderCommand.cpp"/>
-        <source>--notes "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
-        <translation>--notes "%1" は複数のジョブに対して 1 つのファイルです: ジョブファイルの名前を表す {} を含む名前が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>

@@ -82,9 +82,18 @@ struct TemplatesCommand
 /// `kareport check`
 struct CheckCommand
 {
-    QString file;
+    QStringList files;            ///< template files and job files; "-" for a job on standard input
+    QStringList sets;             ///< keys of the jobs
+    bool strict = false;          ///< what render would note is an error
+    std::optional<QString> notes; ///< a file that the notes on a job are written to, as JSON
+    bool json = false;
+    bool progress = false;
+    bool quiet = false; ///< errors alone
 
-    ExitStatus run() const;
+    /// What is wrong with the options together; nothing when they make sense.
+    std::optional<QString> usageError() const;
+    /// `argc` and `argv` are the program's own, for Qt.
+    ExitStatus run(int &argc, char **argv) const;
 };
 
 /// `kareport view`

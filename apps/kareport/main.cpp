@@ -247,6 +247,51 @@ CLI::App *addConvert(CLI::App &program, ConvertOptions &options)
     return convert;
 }
 
+/// What the options of `kareport check` are read into.
+struct CheckOptions
+{
+    std::vector<std::string> files;
+    std::vector<std::string> sets;
+    bool strict = false;
+    std::optional<std::string> notes;
+    bool json = false;
+    bool progress = false;
+    bool quiet = false;
+
+    kareport::CheckCommand command() const
+    {
+        return {texts(files), texts(sets), strict, textIfAny(notes), json, progress, quiet};
+    }
+};
+
+CLI::App *addCheck(CLI::App &program, CheckOptions &options)
+{
+    CLI::App *check = program.add_subcommand(
+        "check", "Report what in template files is not read as it looks, and how the data of jobs fits its template");
+    check->add_option("FILE", options.files, "Template file (XML) or job file (JSON), - for a job on standard input")
+        ->required();
+    check
+        ->add_option("--set", options.sets,
+                     "Set a key of the jobs, such as settings.lengthUnit=ft. Can be given several times")
+        ->type_name("KEY=VALUE")
+        ->allow_extra_args(false);
+    check->add_flag("--strict", options.strict, "Treat it as an error when data and template do not match");
+    check->add_option("--notes", options.notes, "Write the notes on the data of a job to a file, as JSON")
+        ->type_name("FILE");
+    check->add_flag("--json", options.json, "Write JSON, for programs");
+    check->add_flag("--progress", options.progress, "Show the progress of the work");
+    check->add_flag("--quiet", options.quiet, "Print nothing but errors");
+    check->footer(
+        "Each remark is one line, file:line:column: warning|error: text. Of a job, the template, the data and all steps\n"
+        "are checked, and each field that data is printed in is listed: the width of its column, the widest value with its\n"
+        "row, and whether values and label fit. Nothing is written.\n"
+        "Exit status: 0 without errors, 2 with.\n"
+        "Examples:\n"
+        "  kareport check survey.xml stakeout.json\n"
+        "  kareport check stakeout.json --set settings.lengthUnit=usft");
+    return check;
+}
+
 /// Runs a command that makes reports.
 template <typename Command>
 int runReportCommand(const Command &command, const char *name, int argc, char **argv)
@@ -302,12 +347,8 @@ int runProgram(int argc, char **argv)
         ->type_name("NAME");
     templatesCommand->add_flag("--json", templatesJson, "Write JSON, for programs");
 
-    std::string checkFile;
-    CLI::App *checkCommand = program.add_subcommand(
-        "check", "Report what in a template file is not read, or is read differently from how it looks");
-    checkCommand->add_option("FILE", checkFile, "Template file")->required();
-    checkCommand->footer("Each remark is one line, file:line:column: warning|error: text.\n"
-                         "Exit status: 0 without errors, 2 with.");
+    CheckOptions check;
+    CLI::App *checkCommand = addCheck(program, check);
 
     std::string viewFile;
     CLI::App *viewCommand = program.add_subcommand("view", "Open a report, a job or a template in a window");
@@ -331,7 +372,10 @@ int runProgram(int argc, char **argv)
     if (templatesCommand->parsed()) {
         return kareport::TemplatesCommand{text(templatesFile), text(templatesName), templatesJson}.run();
     }
-    return kareport::CheckCommand{text(checkFile)}.run();
+    if (checkCommand->parsed()) {
+        return runReportCommand(check.command(), "check", argc, argv);
+    }
+    return exitUsage;
 }
 
 } // namespace

@@ -72,4 +72,23 @@ QString didYouMean(QStringView misspelt, const QStringList &known)
     return name.isEmpty() ? QString() : Xlate("did you mean \"%1\"?").arg(name);
 }
 
+QString withQuestion(const QString &sentence, QStringView misspelt, const QStringList &known)
+{
+    const QString question = didYouMean(misspelt, known);
+    return question.isEmpty() ? sentence : sentence + QStringLiteral(": ") + question;
+}
+
+QString oneOfExpected(QStringView given, const QStringList &known)
+{
+    constexpr qsizetype mostNames = 40;
+    QStringList shown = known.mid(0, mostNames);
+    if (known.size() > mostNames) {
+        shown.append(QStringLiteral("…"));
+    }
+    const QString all = shown.isEmpty() ? Xlate("none") : shown.join(QStringLiteral(", "));
+    const QString question = didYouMean(given, known);
+    const QString expected = Xlate("one of %1 was expected").arg(all);
+    return question.isEmpty() ? expected : expected + QStringLiteral("; ") + question;
+}
+
 } // namespace kareport

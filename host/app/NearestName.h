@@ -13,4 +13,11 @@ QString nearestName(QStringView misspelt, const QStringList &known);
 /// A question such as `did you mean "Elevation"?`, or empty when no name is near.
 QString didYouMean(QStringView misspelt, const QStringList &known);
 
+/// A sentence with such a question after it, where a name is near: `there is no "Elev": did you mean "Elevation"?`
+QString withQuestion(const QString &sentence, QStringView misspelt, const QStringList &known);
+
+/// What would have been right: `one of m, ft was expected`, or `none` where there are no names, with a question after it
+/// where a name is near.
+QString oneOfExpected(QStringView given, const QStringList &known);
+
 } // namespace kareport

@@ -14,14 +14,15 @@ struct LengthRow
     QStringView key;
     double metres;
     QStringView symbol;
+    QStringView name;
 };
 
 constexpr std::array<LengthRow, 5> lengths = {{
-    {LengthUnit::Metre, u"m", 1.0, u"m"},
-    {LengthUnit::Millimetre, u"mm", 0.001, u"mm"},
-    {LengthUnit::Kilometre, u"km", 1000.0, u"km"},
-    {LengthUnit::InternationalFoot, u"ft", 0.3048, u"ft"},
-    {LengthUnit::UsSurveyFoot, u"usft", 1200.0 / 3937.0, u"ft"},
+    {LengthUnit::Metre, u"m", 1.0, u"m", u"m"},
+    {LengthUnit::Millimetre, u"mm", 0.001, u"mm", u"mm"},
+    {LengthUnit::Kilometre, u"km", 1000.0, u"km", u"km"},
+    {LengthUnit::InternationalFoot, u"ft", 0.3048, u"ft", u"ft"},
+    {LengthUnit::UsSurveyFoot, u"usft", 1200.0 / 3937.0, u"ft", u"US ft"},
 }};
 
 struct AreaRow
@@ -29,14 +30,15 @@ struct AreaRow
     AreaUnit unit;
     QStringView key;
     double squareMetres;
+    QStringView name;
 };
 
 constexpr std::array<AreaRow, 5> areas = {{
-    {AreaUnit::SquareMetre, u"m2", 1.0},
-    {AreaUnit::Hectare, u"ha", 10000.0},
-    {AreaUnit::SquareKilometre, u"km2", 1000000.0},
-    {AreaUnit::SquareFoot, u"ft2", 0.09290304},
-    {AreaUnit::Acre, u"ac", 4046.8564224},
+    {AreaUnit::SquareMetre, u"m2", 1.0, u"m²"},
+    {AreaUnit::Hectare, u"ha", 10000.0, u"ha"},
+    {AreaUnit::SquareKilometre, u"km2", 1000000.0, u"km²"},
+    {AreaUnit::SquareFoot, u"ft2", 0.09290304, u"ft²"},
+    {AreaUnit::Acre, u"ac", 4046.8564224, u"ac"},
 }};
 
 struct AngleRow
@@ -44,12 +46,13 @@ struct AngleRow
     AngleUnit unit;
     QStringView key;
     double perRadian;
+    QStringView name;
 };
 
 constexpr std::array<AngleRow, 3> angles = {{
-    {AngleUnit::Degree, u"deg", 180.0 / std::numbers::pi},
-    {AngleUnit::Gon, u"gon", 200.0 / std::numbers::pi},
-    {AngleUnit::Radian, u"rad", 1.0},
+    {AngleUnit::Degree, u"deg", 180.0 / std::numbers::pi, u"°"},
+    {AngleUnit::Gon, u"gon", 200.0 / std::numbers::pi, u"gon"},
+    {AngleUnit::Radian, u"rad", 1.0, u"rad"},
 }};
 
 /// Whether each row is at the place of its unit, where it is looked up.
@@ -102,6 +105,21 @@ double perRadian(AngleUnit unit)
 QStringView symbolOf(LengthUnit unit)
 {
     return rowOf(lengths, unit).symbol;
+}
+
+QStringView nameOf(LengthUnit unit)
+{
+    return rowOf(lengths, unit).name;
+}
+
+QStringView nameOf(AreaUnit unit)
+{
+    return rowOf(areas, unit).name;
+}
+
+QStringView nameOf(AngleUnit unit)
+{
+    return rowOf(angles, unit).name;
 }
 
 std::optional<LengthUnit> lengthUnitFromKey(QStringView key)

@@ -17,6 +17,10 @@ double squareMetresIn(AreaUnit unit);
 double perRadian(AngleUnit unit);
 /// The symbol that is shown after a length; both feet show "ft".
 QStringView symbolOf(LengthUnit unit);
+/// What a text that speaks of a unit calls it: "US ft" and "ft" are told apart there.
+QStringView nameOf(LengthUnit unit);
+QStringView nameOf(AreaUnit unit);
+QStringView nameOf(AngleUnit unit);
 
 /// The unit of a settings key such as "usft", "ha" or "gon"; nothing for any other text. Case matters.
 std::optional<LengthUnit> lengthUnitFromKey(QStringView key);

@@ -47,4 +47,21 @@ TEST(NearestName, Asks)
     EXPECT_EQ(didYouMean(u"Zzz", {"Elevation"}).toStdString(), "");
 }
 
+TEST(NearestName, SaysWhatWouldHaveBeenRight)
+{
+    using kareport::oneOfExpected;
+    EXPECT_EQ(oneOfExpected(u"usfeet", {"m", "ft"}).toStdString(), "one of m, ft was expected");
+    EXPECT_EQ(oneOfExpected(u"utf8", {"utf-8", "latin-1"}).toStdString(),
+              "one of utf-8, latin-1 was expected; did you mean \"utf-8\"?");
+    EXPECT_EQ(oneOfExpected(u"a", {}).toStdString(), "one of none was expected");
+    QStringList many;
+    for (int i = 0; i < 41; ++i) {
+        many.append(QStringLiteral("name%1").arg(i));
+    }
+    EXPECT_TRUE(oneOfExpected(u"other", many).endsWith(u"name39, … was expected")) << "not all of very many";
+    EXPECT_EQ(kareport::withQuestion(QStringLiteral("wrong"), u"Elev", {"Elevation"}).toStdString(),
+              "wrong: did you mean \"Elevation\"?");
+    EXPECT_EQ(kareport::withQuestion(QStringLiteral("wrong"), u"Zzz", {"Elevation"}).toStdString(), "wrong");
+}
+
 } // namespace

@@ -108,4 +108,21 @@ TEST(UnitFactors, AKeyOfNoUnitGivesNothing)
     EXPECT_EQ(angleUnitFromKey(u"dms"), std::nullopt) << "only bearings are shown so";
 }
 
+TEST(UnitFactors, TheFeetAreToldApartInTexts)
+{
+    EXPECT_EQ(nameOf(LengthUnit::InternationalFoot), u"ft");
+    EXPECT_EQ(nameOf(LengthUnit::UsSurveyFoot), u"US ft");
+    for (const LengthUnit unit : {LengthUnit::Metre, LengthUnit::Millimetre, LengthUnit::Kilometre}) {
+        EXPECT_EQ(nameOf(unit), symbolOf(unit));
+    }
+    EXPECT_EQ(nameOf(AreaUnit::SquareMetre), u"m²");
+    EXPECT_EQ(nameOf(AreaUnit::Hectare), u"ha");
+    EXPECT_EQ(nameOf(AreaUnit::SquareKilometre), u"km²");
+    EXPECT_EQ(nameOf(AreaUnit::SquareFoot), u"ft²");
+    EXPECT_EQ(nameOf(AreaUnit::Acre), u"ac");
+    EXPECT_EQ(nameOf(AngleUnit::Degree), u"°");
+    EXPECT_EQ(nameOf(AngleUnit::Gon), u"gon");
+    EXPECT_EQ(nameOf(AngleUnit::Radian), u"rad");
+}
+
 } // namespace

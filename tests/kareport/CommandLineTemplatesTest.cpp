@@ -3,7 +3,6 @@
 #include <QJsonArray>
 #include <QJsonDocument>
 #include <QJsonObject>
-#include <QRegularExpression>
 
 #include <gtest/gtest.h>
 
@@ -99,91 +98,6 @@ TEST(CommandLineTemplates, WhatCannotBeListedIsStatus2)
         EXPECT_TRUE(run.err.startsWith(row.begins)) << row.reason << "\n" << run.err.constData();
         EXPECT_TRUE(run.err.contains(row.contains)) << row.reason << "\n" << run.err.constData();
     }
-}
-
-/// Every line of the check's output is file:line:column: warning|error: text.
-void expectCheckLines(const QByteArray &out)
-{
-    static const QRegularExpression form(QStringLiteral(R"(\At\.xml:[1-9]\d*:[1-9]\d*: (warning|error): \S.*\z)"));
-    EXPECT_TRUE(out.isEmpty() || out.endsWith('\n')) << out.constData();
-    for (const QByteArray &line : out.split('\n')) {
-        EXPECT_TRUE(line.isEmpty() || form.match(QString::fromUtf8(line)).hasMatch()) << line.constData();
-    }
-}
-
-TEST(CommandLineCheck, SaysNothingOfAGoodFile)
-{
-    const CommandLineFolder folder;
-    const ProgramRun run = folder.run("check t.xml");
-    EXPECT_EQ(run.status, 0) << run.all().constData();
-    EXPECT_EQ(run.out, "");
-    EXPECT_EQ(run.err, "");
-}
-
-TEST(CommandLineCheck, SaysWhatIsIgnoredInSilence)
-{
-    struct Row
-    {
-        const char *before;
-        const char *after;
-        const char *remark; ///< begins a line of the output, with the place and what it is
-        int status;         ///< -1 for either
-        const char *reason;
-    };
-    constexpr Row rows[] = {
-        {"<Label>Pt</Label>", "<Label >Pt</Label>", "t.xml:5:43: error: ", 2, "a tag with a blank"},
-        {"<Tables>", "<Tables id=\"1\">", "t.xml:4:1: error: ", 2, "a tag with an attribute"},
-        {"<Title>Control points</Title>", "<Title>Control <Title>all</Title> points</Title>", "t.xml:3:", -1,
-         "an element that is cut short at the first closing tag"},
-        {"<OutputList>\n<Field>", "<OutputList>\n<Field></Field><Field>", "t.xml:5:1: error: ", 2,
-         "an empty element that ends its list"},
-        {"<ReportTemplate><Name>SITE", "<ReportTemplate><Tables></Tables><Name>SITE", "t.xml:17:34: error: ", 2,
-         "a name after the tables"},
-        {"<Name>CONTROL</Name><Title>Control points</Title>\n", "\n", "t.xml:", 2, "no name of its own"},
-        {"<Type>COORDINATE</Type>", "<Type>COORD</Type>", "t.xml:10:58: error: ", 2, "an unknown type"},
-        {"<VariableName>Northing</VariableName><Label>", "<VariableName>Height</VariableName><Label>",
-         "t.xml:6:8: error: ", 2, "a variable that the dictionary lacks"},
-        {"<Use>Survey</Use><Sort>", "<Use>Site</Use><Sort>", "t.xml:4:35: error: ", 2,
-         "a table whose dictionary is missing"},
-        {"<Label>Pt</Label><Format>5</Format>", "<Label>Point no.</Label><Format>5</Format>",
-         "t.xml:5:43: warning: ", 0, "a label wider than its column"},
-        {"<Separator>124</Separator>", "", "t.xml:", -1, "a missing separator"},
-        {"<Name>SITE</Name>", "<Name>control</Name>", "t.xml:17:17: warning: ", 0, "two templates of one name"},
-    };
-    for (const Row &row : rows) {
-        const CommandLineFolder folder;
-        QByteArray content = controlTemplates();
-        ASSERT_TRUE(content.contains(row.before)) << row.reason;
-        const qsizetype at = content.indexOf(row.before);
-        content.replace(at, qsizetype(qstrlen(row.before)), row.after);
-        folder.put("t.xml", content);
-        const ProgramRun run = folder.run("check t.xml");
-        expectCheckLines(run.out);
-        EXPECT_TRUE(('\n' + run.out).contains(QByteArray("\n") + row.remark)) << row.reason << "\n"
-                                                                              << run.all().constData();
-        EXPECT_EQ(run.status, run.out.contains(": error: ") ? 2 : 0) << row.reason << ": 2 with errors only";
-        if (row.status >= 0) {
-            EXPECT_EQ(run.status, row.status) << row.reason << "\n" << run.all().constData();
-        }
-        EXPECT_EQ(run.err, "") << row.reason;
-    }
-}
-
-TEST(CommandLineCheck, AFileThatIsNotATemplateIsStatus2)
-{
-    for (const QByteArray &content :
-         {QByteArray(), QByteArray(5000, '\0'), QByteArray("text"), QByteArray("\xFF\xFE<")}) {
-        const CommandLineFolder folder;
-        folder.put("t.xml", content);
-        const ProgramRun run = folder.run("check t.xml");
-        EXPECT_EQ(run.status, 2) << run.all().constData();
-        expectCheckLines(run.out);
-        EXPECT_TRUE(run.out.startsWith("t.xml:1:1: error: ")) << run.all().constData();
-    }
-    const CommandLineFolder folder;
-    const ProgramRun run = folder.run("check none.xml");
-    EXPECT_EQ(run.status, 2);
-    EXPECT_TRUE((run.out + run.err).startsWith("none.xml")) << run.all().constData();
 }
 
 } // namespace

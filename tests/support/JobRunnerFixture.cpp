@@ -43,8 +43,12 @@ void TestJob::runWhole(const QByteArray &json)
     report_ = std::make_unique<UReportDoc>(kareport::surroundingsOf(job));
     kareport::Progress progress(false);
     kareport::JobRunner runner(job, std::get<kareport::JsonSource>(source), progress);
+    if (measures) {
+        runner.measure();
+    }
     error = runner.run(*report_);
     notes = runner.notes();
+    fits = runner.fits();
 }
 
 QString TestJob::text()

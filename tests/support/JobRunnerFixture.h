@@ -42,6 +42,8 @@ public:
     JobFolder folder;
     std::optional<kareport::InputError> error;
     kareport::JobNotes notes;
+    bool measures = false; ///< whether the next run measures how the data fits
+    std::vector<kareport::StepFit> fits;
 
 private:
     std::unique_ptr<UReportDoc> report_;

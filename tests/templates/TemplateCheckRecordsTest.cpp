@@ -143,13 +143,76 @@ TEST(TemplateCheckRecords, RemarksOnFields)
          "a negative width that must be a mistake"},
         {"<Align>RIGHT</Align>",
          "¦<Align>RIGTH</Align>",
-         {{"warning", "the alignment \"RIGTH\" counts as LEFT"}},
+         {{"warning", "the alignment \"RIGTH\" counts as LEFT: did you mean \"RIGHT\"?"}},
          "an unknown alignment"},
         {inBlock,
          "<Format>3</Format>¦<Align>CENTER</Align>",
          {{"warning", "the alignment \"CENTER\" counts as LEFT"}},
          "a block is never centred"},
         {inBlock, "<Format>3</Format><Align>Right</Align>", {}, "a block can be aligned right"},
+    });
+}
+
+TEST(TemplateCheckRecords, RemarksOnFormatsThatAreNone)
+{
+    const char *const inTable = "<Label>Point</Label><Format>8</Format>";
+    const struct
+    {
+        const char *format;
+        const char *read;
+    } rows[] = {{"10,3", "10.0"}, {"10.x", "10.0"}, {"8.2.2", "8.2"}, {"8.", "8.0"},  {".2", "0.2"},
+                {"8 2", "8.0"},   {"8cm", "8.0"},   {"x", "0.0"},     {"8.-1", "8.0"}};
+    for (const auto &row : rows) {
+        const std::string now = std::string("<Label></Label>¦<Format>") + row.format + "</Format>";
+        const std::string remark = std::string("the format \"") + row.format + "\" counts as " + row.read +
+                                   ": a width such as 12, or a width and decimals such as 12.3, was expected";
+        expectRemarks(changedTemplate(inTable, now.c_str()), {{"warning", remark.c_str()}}, row.format);
+    }
+}
+
+TEST(TemplateCheckRecords, NamesWhatMayHaveBeenMeant)
+{
+    expectAll({
+        {"<Use>pointdic</Use>",
+         "¦<Use>pointdict</Use>",
+         {{"error", "there is no dictionary named \"pointdict\": \"Points\" cannot be written: did you mean "
+                    "\"PointDic\"?"}},
+         "a dictionary"},
+        {"        </VariableList>",
+         "<Variable><ID>9</ID><VariableName>R</VariableName>¦<Type>Coordinates</Type></Variable></VariableList>",
+         {{"error", "unknown type \"Coordinates\": the variable \"R\" is left out: did you mean \"COORDINATE\"?"}},
+         "a type"},
+        {"<Sort><VariableName>Number",
+         "<Sort>¦<VariableName>Nummer",
+         {{"error", "the sort key \"Nummer\" is not in the dictionary \"pointdic\": did you mean \"Number\"?"}},
+         "a sort key"},
+        {"<Field><VariableName>northing",
+         "<Field>¦<VariableName>north",
+         {{"error", "the dictionary has no variable \"north\": the line repeats the value before it: did you mean "
+                    "\"Northing\"?"}},
+         "a variable"},
+    });
+}
+
+TEST(TemplateCheckRecords, RemarksOnNamesThatStandTwice)
+{
+    const std::string list =
+        "<Use>PointDic</Use><OutputList><Field><VariableName>Number</VariableName></Field></OutputList>";
+    const std::string table = "<Table>¦<Name>POINTS</Name>" + list + "</Table></Tables>";
+    const std::string block = "<Block>¦<Name>site</Name>" + list + "</Block></Blocks>";
+    expectAll({
+        {"    </Tables>",
+         table.c_str(),
+         {{"warning", "a table named \"POINTS\" comes before this one: the first one of a name is written"}},
+         "a table"},
+        {"    </Blocks>",
+         block.c_str(),
+         {{"warning", "a block named \"site\" comes before this one: the first one of a name is written"}},
+         "a block"},
+        {"    </Dictionaries>",
+         "<Dictionary>¦<DictionaryName>POINTDIC</DictionaryName><VariableList></VariableList></Dictionary></Dictionaries>",
+         {{"warning", "a dictionary named \"POINTDIC\" comes before this one: the variables of both count together"}},
+         "a dictionary"},
     });
 }
 

@@ -33,7 +33,12 @@ TEST(TemplateCheck, SaysNothingAboutWhatIsReadAsItLooks)
         {"<Align>RIGHT</Align>", "<Align>center</Align>", {}, "a centred column"},
         {"<Label>North</Label><Format>12.3</Format>", "<Label>North</Label>", {}, "a column as wide as its label"},
         {"<Label>Point</Label><Format>8</Format>", "<Label>Point</Label><Format>5</Format>", {}, "a label that fits"},
-        {"    <Dictionaries>", "    <Unknown a=\"1\"/>\n    <Dictionaries>", {}, "an element of another kind"},
+        {"    <Dictionaries>", "    <!-- text --><?note text?>\n    <Dictionaries>", {}, "a comment, an instruction"},
+        {"<Templates>", "<Templates version=\"2\"><Author>", {}, "elements around the templates"},
+        {"<Templates>", "<ReportTemplates>", {}, "an element around the templates, which is nearly named as they are"},
+        {"<Label>North</Label><Format>12.3</Format>", "<Label>North</Label><Format> 12.3 </Format>", {}, "blanks"},
+        {"<Label>North</Label><Format>12.3</Format>", "<Label></Label><Format></Format>", {}, "no format"},
+        {"<Format>3</Format>", "<Format>-3</Format>", {}, "a width below 0 fills on the right"},
         {"<VariableName>FILLER", "<VariableName>suffix_+", {}, "a marker needs no variable"},
     };
     for (const Row &row : rows) {
@@ -94,6 +99,99 @@ TEST(TemplateCheck, RemarksOnTags)
     for (const Row &row : rows) {
         expectRemarks(changedTemplate(row.was, row.now), row.remarks, row.reason);
     }
+}
+
+TEST(TemplateCheck, RemarksOnWhatNobodyReads)
+{
+    const char *const title = "<Title>Stakeout</Title>";
+    const char *const align = "<Align>RIGHT</Align>";
+    const Row rows[] = {
+        {align,
+         "¦<Aling>RIGHT</Aling>",
+         {{"error", "unknown element <Aling>: did you mean \"Align\"?"}},
+         "a misspelt element, with its text"},
+        {"<Separator>|</Separator>",
+         "<Separator>|</Separator>¦<Pagebreak>NO</Pagebreak>",
+         {{"error", "unknown element <Pagebreak>: did you mean \"PageBreaks\"?"}},
+         "the beginning of a name"},
+        {align,
+         "¦<Unit>m</Unit>",
+         {{"warning", "unknown element <Unit>: nobody reads it"}},
+         "an element of another kind"},
+        {align,
+         "¦<Remark date=\"5\"/>",
+         {{"warning", "unknown element <Remark>: nobody reads it"}},
+         "one with an attribute and no content"},
+        {align,
+         "¦<Remark>¦see ¦<b>there</b> ¦and elsewhere</Remark>",
+         {{"warning", "unknown element <Remark>: nobody reads it"},
+          {"warning", "the text \"see\" is in no element: nobody reads it"},
+          {"warning", "unknown element <b>: nobody reads it"},
+          {"warning", "the text \"and elsewhere\" is in no element: nobody reads it"}},
+         "one in another"},
+        {"    <Dictionaries>",
+         "    ¦<Fields><Sort></Sort></Fields><Dictionaries>",
+         {{"warning", "unknown element <Fields>: did you mean \"Field\"?"}},
+         "what is in it may be read all the same"},
+        {align,
+         "¦RIGHT",
+         {{"warning", "the text \"RIGHT\" is in no element: nobody reads it"}},
+         "text between elements"},
+        {title,
+         "<Title>Stakeout</Title> ¦of\n the harbour",
+         {{"warning", "the text \"of the harbour\" is in no element: nobody reads it"}},
+         "text after a value"},
+        {"</Templates>",
+         "</Templates>\n¦two lines\nof text\n",
+         {{"warning", "no template follows: the last 17 characters, in 2 lines, are not read"}},
+         "text after the last template"},
+        {"<Templates>",
+         "<Templates>\n  ¦text & more",
+         {{"warning", "this text is in no template: 44 characters in 2 lines are not read"}},
+         "text before the first template"},
+        {"</Templates>",
+         "  ¦<ReportTemplat><Name>B</Name></ReportTemplat></Templates>",
+         {{"error", "unknown element <ReportTemplat>: did you mean \"ReportTemplate\"?"}},
+         "a whole template that nobody reads"},
+    };
+    for (const Row &row : rows) {
+        expectRemarks(changedTemplate(row.was, row.now), row.remarks, row.reason);
+    }
+}
+
+TEST(TemplateCheck, AManyTimesMisspeltFileIsWalkedSoon)
+{
+    for (const char *piece :
+         {"<Name>", "<x>", "</x>", "<", "< ", "<!-- ", "<Name", "a<b>c", "</>", "<ReportTemplat><Name>"})
+    {
+        const QString text = QStringLiteral("<ReportTemplate>") + QString::fromLatin1(piece).repeated(100'000);
+        EXPECT_FALSE(kareport::checkTemplates(kareport::TemplateFile(text.toUtf8())).empty()) << piece;
+    }
+}
+
+TEST(TemplateCheck, LeavesTheRemarksOnOneTemplate)
+{
+    const QString rest = QStringLiteral("<Options><Separator>|</Separator></Options></ReportTemplate>\n");
+    const QString text = QStringLiteral("<ReportTemplate><Name>A</Name><Title>&amp;</Title>") + rest +
+                         QStringLiteral("between\n<ReportTemplate><Name>B</Name>") + rest +
+                         QStringLiteral("<ReportTemplate><Name>a</Name>text") + rest;
+    const kareport::TemplateFile file(text.toUtf8());
+    EXPECT_EQ(kareport::checkTemplates(file).size(), 4U);
+    const auto ofOne = kareport::checkTemplates(file, {.name = QStringLiteral("A")});
+    ASSERT_EQ(ofOne.size(), 2U) << "those on the last one of the name";
+    EXPECT_EQ(ofOne[0].text.toStdString(),
+              "a template named \"a\" comes before this one: the last one of a name is read");
+    EXPECT_EQ(ofOne[1].text.toStdString(), "the text \"text\" is in no element: nobody reads it");
+    EXPECT_TRUE(kareport::checkTemplates(file, {.name = QStringLiteral("B")}).empty());
+    EXPECT_TRUE(kareport::checkTemplates(file, {.name = QStringLiteral("C")}).empty()) << "there is none";
+}
+
+TEST(TemplateCheck, ALabelWithPlaceholdersIsNotAsWideAsItLooks)
+{
+    const QString text = changedTemplate("<Label>Point</Label>", "<Label>Pt {lengthUnit}</Label>");
+    const kareport::TemplateFile file(text.toUtf8());
+    EXPECT_EQ(kareport::checkTemplates(file).size(), 1U);
+    EXPECT_TRUE(kareport::checkTemplates(file, {.hasPlaceholders = true}).empty());
 }
 
 TEST(TemplateCheck, RemarksOnTemplatesAndTheirNames)

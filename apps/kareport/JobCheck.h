@@ -1,0 +1,45 @@
+#pragma once
+
+#include "Commands.h"
+#include "InputError.h"
+#include "JobNotes.h"
+#include "JsonSource.h"
+#include "Progress.h"
+#include "StepFit.h"
+
+#include <vector>
+
+namespace kareport
+{
+
+/// Something that `kareport check` says of a file.
+struct CheckRemark
+{
+    bool isError;
+    InputError about;
+};
+
+/// What was found in a file.
+struct CheckedFile
+{
+    QString file;
+    bool isJob = false;
+    bool isStopped = false;          ///< by an interrupt
+    std::optional<QString> wrongSet; ///< what is wrong with a key that the command line sets
+    std::vector<CheckRemark> remarks;
+    std::vector<StepFit> steps; ///< of a job
+    JobNotes notes;             ///< the same
+
+    void add(bool isError, const InputError &about) { remarks.push_back({isError, about}); }
+    bool hasErrors() const;
+};
+
+/// Checks a template file.
+CheckedFile checkTemplateFile(const QString &file);
+
+/// Checks a job with its template, its data and its steps: the report is made and thrown away, in one pass over the data.
+/// @param isStrict  what the report notes is an error, also where the job does not say so
+CheckedFile checkJob(const QString &file, Expected<JsonSource> source, const QStringList &sets, bool isStrict,
+                     Progress &progress);
+
+} // namespace kareport
