@@ -92,7 +92,7 @@ std::vector<FieldFit> fieldFits(bool isTable, const QString &name, const sXmlRep
         fit.widest = column.widest;
         fit.row = column.widestRow;
         fit.line = column.widestLine;
-        fit.tooWide = column.tooWide.count;
+        fit.tooWide = column.tooWide.count + column.wideZeros;
         fits.push_back(std::move(fit));
     }
     return fits;

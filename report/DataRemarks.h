@@ -26,6 +26,7 @@ struct ColumnRemarks
     ValueCount missing;    ///< values that are not there and show as 0
     ValueCount blank;      ///< numbers that are not there and show as blanks, as asked for
     ValueCount notFinite;  ///< values that are infinite or not-a-number
+    quint64 wideZeros = 0; ///< how many of the missing values show as a 0 that is wider than the column
     WidestText widest;     ///< the widest value, where it is asked for
     quint64 widestRow = 0; ///< of the table, from 1; 0 for none
     qint64 widestLine = 0; ///< of the report, from 1

@@ -182,7 +182,8 @@ void DataWriter::formatRow(const std::vector<FieldFormatter> &fields, const UDat
                 addShown(remarks, about, field.append(row_, options_, entry->kind(), entry->GetData(), suffix, widest),
                          row);
             } else {
-                field.append(row_, options_, ValueKind::None, nullptr, suffix, widest);
+                const Shown shown = field.append(row_, options_, ValueKind::None, nullptr, suffix, widest);
+                about.wideZeros += shown == Shown::TooWide ? 1U : 0U;
                 if (field.showsZeroForNone(options_)) {
                     remarks.add(about.missing, row);
                 } else if (field.showsZeroForNone(FormatOptions())) {

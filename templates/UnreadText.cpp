@@ -55,6 +55,8 @@ private:
     qsizetype endOfValue(const TagPlace &tag);
     qsizetype endOfTemplate(qsizetype from);
     void take(const TagPlace &tag);
+    void noteList(const TagPlace &tag);
+    void takeMarkup();
     void takeText(qsizetype from, qsizetype to);
     void takeElement(const TagPlace &tag);
     void closeGap(qsizetype end, UnreadPiece::Kind kind);
@@ -64,7 +66,8 @@ private:
     qsizetype at_ = 0;
     bool inTemplate_ = false;
     bool hasTemplate_ = false;
-    qsizetype gap_ = -1; ///< where the text around templates begins that no piece has yet; -1 for none
+    qsizetype gap_ = -1;             ///< where the text around templates begins that no piece has yet; -1 for none
+    std::vector<QStringView> lists_; ///< the names of the elements that are open and hold elements
     std::unordered_map<QString, qsizetype> closings_; ///< the next closing tags, by their folded names
     std::vector<UnreadPiece> pieces_;
 };
@@ -79,7 +82,7 @@ std::vector<UnreadPiece> Walk::pieces()
         if (tag) {
             take(*tag);
         } else if (at_ < text_.size()) {
-            at_ = afterMarkup(at_);
+            takeMarkup();
         }
     }
     closeGap(text_.size(), UnreadPiece::Kind::AfterLast);
@@ -173,6 +176,30 @@ void Walk::take(const TagPlace &tag)
         takeElement(tag);
     } else if (inTemplate_ && !tag.isClosing && !tag.isEmpty && isValueName(tag.name)) {
         at_ = endOfValue(tag);
+    } else if (isExact) {
+        noteList(tag);
+    }
+}
+
+/// Keeps the names of the open elements that hold others. One that is closed somewhere else stays.
+void Walk::noteList(const TagPlace &tag)
+{
+    if (!tag.isClosing) {
+        lists_.push_back(tag.name);
+    } else if (!lists_.empty() && equalFolded(lists_.back(), tag.name)) {
+        lists_.pop_back();
+    }
+}
+
+/// Passes over what is no tag. With a short closing tag of a list as many characters go as a full one has.
+void Walk::takeMarkup()
+{
+    const bool isShortTag = text_.sliced(at_).startsWith(u"</>");
+    at_ = afterMarkup(at_);
+    if (isShortTag && !lists_.empty()) {
+        const qsizetype next = text_.indexOf(u'<', at_);
+        at_ = std::min(at_ + lists_.back().size(), next < 0 ? text_.size() : next);
+        lists_.pop_back();
     }
 }
 

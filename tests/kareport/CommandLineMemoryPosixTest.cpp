@@ -90,13 +90,16 @@ TEST(CommandLineMemory, WhereverItEndsTheProgramSaysSo)
 }
 
 /// The peak of the program's memory for a job in a folder, in kilobytes; -1 when it fails.
-long peakOf(const QString &folder, const char *job)
+long peakOf(const QString &folder, const char *job, bool isCheck = false)
 {
     const QByteArray program = KAREPORT_PROGRAM;
     const QByteArray path = folder.toUtf8();
     const pid_t child = fork();
     if (child == 0) {
         if (chdir(path.constData()) == 0) {
+            if (isCheck) {
+                execl(program.constData(), program.constData(), "check", job, "--quiet", nullptr);
+            }
             execl(program.constData(), program.constData(), "render", job, "-o", "out.rep", "--quiet", nullptr);
         }
         _exit(127);
@@ -160,6 +163,31 @@ TEST(CommandLineMemory, DoesNotGrowWithTheRows)
         ASSERT_GT(few[i], 0) << rows[i].reason;
         ASSERT_GT(many[i], 0) << rows[i].reason;
         EXPECT_LT(many[i] - few[i], mostKilobytes) << rows[i].reason << ": " << few[i] << " and " << many[i];
+    }
+}
+
+TEST(CommandLineMemory, ACheckDoesNotGrowWithTheRows)
+{
+#if defined(__SANITIZE_ADDRESS__)
+    GTEST_SKIP() << "the address sanitizer keeps what was freed";
+#endif
+    const CommandLineFolder folder;
+    const auto peak = [&](int rows, const char *steps) {
+        folder.put("points.csv", "Number,Northing\n" + QByteArray("1000000001,12.5\n").repeated(rows));
+        folder.put("job.json", QByteArray(R"({"page": {"linesPerPage": 72, "charsPerRow": 80}, "header": false,
+            "template": {"file": "t.xml", "name": "CONTROL"}, "data": {"p": {"csv": "points.csv"}}, "report": [)") +
+                                   steps + "]}");
+        return peakOf(folder.path(), "job.json", true);
+    };
+    constexpr long mostKilobytes = 9 * 1024;
+    for (const char *steps :
+         {R"({"table": "Points", "data": "p"})", R"({"table": "Points", "data": "p"}, {"clear": true})"})
+    {
+        const long few = peak(40'000, steps);
+        const long many = peak(400'000, steps);
+        ASSERT_GT(few, 0);
+        ASSERT_GT(many, 0);
+        EXPECT_LT(many - few, mostKilobytes) << steps << ": " << few << " and " << many;
     }
 }
 

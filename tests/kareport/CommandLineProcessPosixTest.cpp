@@ -157,6 +157,9 @@ TEST(CommandLineProcess, TheFirstSignalEndsAReadThatWaits)
         EXPECT_EQ(folder.bytesOf("out.rep"), "kept");
         run = runBlocked(folder, "render wait.json job.json -o {}.rep", signal);
         EXPECT_EQ(run.signal, signal) << "none of a batch is made any more\n" << run.all().constData();
+        run = runBlocked(folder, "check wait.json job.json", signal);
+        EXPECT_EQ(run.signal, signal) << "nothing more is checked\n" << run.all().constData();
+        EXPECT_EQ(run.out, "") << run.all().constData();
         EXPECT_EQ(folder.names(), words("job.json out.rep points.csv t.xml wait.json"));
         close(writer);
     }
