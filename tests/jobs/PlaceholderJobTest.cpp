@@ -85,7 +85,8 @@ TEST(PlaceholderJob, APageNumberIsThatOfThePage)
 TEST(PlaceholderJob, TheWordForStationsHasThemAsWell)
 {
     TestJob test;
-    test.run(jobs::templateJob(R"("p": {"values": [{"Chainage": 5}]})", R"({"table": "Stations", "data": "p"})",
+    test.run(jobs::templateJob(R"("p": {"values": [{"Chainage": 5}]})",
+                               R"({"line": "a"}, {"table": "Stations", "data": "p"})",
                                R"("options": {"placeholders": true, "chainageLabel": "St. {lengthUnit}"}, )"));
     EXPECT_TRUE(test.text().contains(u"St. m")) << test.text().toStdString();
 }
