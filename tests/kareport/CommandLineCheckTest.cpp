@@ -190,7 +190,7 @@ TEST(CommandLineCheck, SaysWhatIsWrongWithAJobItsTemplateOrItsData)
          2, "a template"},
         {"job.json", "\"t.xml\"", "\"u.xml\"", "job.json:2:23: error: there is no template file", 2, "a template file"},
         {"points.csv", "12.5", "12,5", "points.csv:2:6: error: the row has 3 cells", 2, "the data"},
-        {"points.csv", "Northing", "North", "points.csv:1:8: warning: the column \"North\" is no variable", 0,
+        {"points.csv", "Northing", "North", "points.csv:1:8: warning: the column \"North\" is not a variable", 0,
          "a column"},
         {"t.xml", "<Format>9.3</Format>", "<Format>9,3</Format>",
          "t.xml:6:65: warning: the format \"9,3\" counts as 9.0", 0, "a format of its template"},
