@@ -2,6 +2,7 @@
 
 #include "CheckOutput.h"
 #include "CommandSetup.h"
+#include "FileIdentity.h"
 #include "Interrupt.h"
 #include "JobCheck.h"
 #include "ReplaceFile.h"
@@ -10,6 +11,7 @@
 
 #include <QFile>
 #include <QFileInfo>
+#include <QHash>
 #include <QJsonArray>
 #include <QJsonDocument>
 
@@ -45,10 +47,44 @@ CheckedFile noMemoryFor(const QString &file)
     return checked;
 }
 
+/// The file for the notes on a job; empty where none is written.
+QString notesFileOf(const CheckCommand &command, const QString &job)
+{
+    return command.notes.value_or(QString()).replace(QStringLiteral("{}"), QFileInfo(job).completeBaseName());
+}
+
+/// What of the files that are checked the notes would replace, or which notes others.
+std::optional<QString> notesClash(const CheckCommand &command)
+{
+    QHash<QString, QString> taken;
+    for (const QString &file : command.files) {
+        if (file != u"-") {
+            taken.insert(fileIdentity(file),
+                         isJobFile(file)
+                             ? Xlate("\"%1\" is the job itself: an output of its own was expected")
+                             : Xlate("\"%1\" is the template of the job: an output of its own was expected"));
+        }
+    }
+    for (const QString &file : command.files) {
+        const QString notes = isJobFile(file) ? notesFileOf(command, file) : QString();
+        const QString identity = notes.isEmpty() ? QString() : fileIdentity(notes);
+        if (identity.isEmpty()) {
+            continue;
+        }
+        if (const auto clash = taken.constFind(identity); clash != taken.constEnd()) {
+            return clash->arg(notes, notes);
+        }
+        taken.insert(identity,
+                     Xlate("\"%1\" is the file of the output \"%2\" already: an output of its own was expected"));
+    }
+    return std::nullopt;
+}
+
 CheckedFile checkFile(const CheckCommand &command, const QString &file, Progress &progress)
 {
     try {
-        return isJobFile(file) ? checkJob(file, JsonSource::read(file), command.sets, command.strict, progress)
+        return isJobFile(file) ? checkJob(file, JsonSource::read(file), command.sets, command.strict,
+                                          notesFileOf(command, file), progress)
                                : checkTemplateFile(file);
     } catch (const std::bad_alloc &) {
         return noMemoryFor(file);
@@ -56,9 +92,8 @@ CheckedFile checkFile(const CheckCommand &command, const QString &file, Progress
 }
 
 /// @return whether the file with the notes on a job was written
-bool writeNotes(const CheckedFile &checked, QString file)
+bool writeNotes(const CheckedFile &checked, const QString &file)
 {
-    file.replace(QStringLiteral("{}"), QFileInfo(checked.file).completeBaseName());
     const QByteArray json = checked.notes.toJson();
     QString problem;
     const bool isWritten = replaceFile(
@@ -98,6 +133,10 @@ std::optional<QString> CheckCommand::usageError() const
 
 ExitStatus CheckCommand::run(int &argc, char **argv) const
 {
+    if (const auto clash = notesClash(*this)) {
+        printError(QStringLiteral("kareport: ") + *clash);
+        return exitInput;
+    }
     // A job's page may be measured, which takes fonts.
     const bool hasJobs = std::any_of(files.begin(), files.end(), isJobFile);
     const auto application = hasJobs ? startQt(argc, argv, true) : nullptr;
@@ -119,7 +158,8 @@ ExitStatus CheckCommand::run(int &argc, char **argv) const
             printChecked(checked, quiet);
         }
         status = std::max(status, checked.hasErrors() ? exitInput : exitDone);
-        if (notes && checked.isJob && !writeNotes(checked, *notes)) {
+        const bool isNoted = notes && checked.isJob && !checked.isNotesFileNeeded;
+        if (isNoted && !writeNotes(checked, notesFileOf(*this, file))) {
             status = std::max(status, exitOutput);
         }
     }

@@ -106,7 +106,7 @@ CheckedFile checkTemplateFile(const QString &file)
 }
 
 CheckedFile checkJob(const QString &file, Expected<JsonSource> source, const QStringList &sets, bool isStrict,
-                     Progress &progress)
+                     const QString &notesFile, Progress &progress)
 {
     CheckedFile checked;
     checked.file = file;
@@ -128,6 +128,14 @@ CheckedFile checkJob(const QString &file, Expected<JsonSource> source, const QSt
     auto &job = std::get<Job>(read);
     if (const auto clash = outputClash(job, json.path())) {
         checked.add(true, json.errorAt({QStringLiteral("output"), clash->output}, clash->text));
+    }
+    if (!notesFile.isEmpty()) {
+        Job withNotes = job;
+        withNotes.outputs = {{notesFile, OutputKind::Text}};
+        if (const auto clash = outputClash(withNotes, json.path())) {
+            checked.isNotesFileNeeded = true;
+            checked.add(true, {json.path(), std::nullopt, clash->text});
+        }
     }
     checkTemplateOf(job, checked);
     const bool areNotesErrors = isStrict || job.strict;

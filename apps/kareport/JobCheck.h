@@ -25,6 +25,7 @@ struct CheckedFile
     QString file;
     bool isJob = false;
     bool isStopped = false;          ///< by an interrupt
+    bool isNotesFileNeeded = false;  ///< the notes would take the place of a file that the job needs
     std::optional<QString> wrongSet; ///< what is wrong with a key that the command line sets
     std::vector<CheckRemark> remarks;
     std::vector<StepFit> steps; ///< of a job
@@ -38,8 +39,9 @@ struct CheckedFile
 CheckedFile checkTemplateFile(const QString &file);
 
 /// Checks a job with its template, its data and its steps: the report is made and thrown away, in one pass over the data.
-/// @param isStrict  what the report notes is an error, also where the job does not say so
+/// @param isStrict   what the report notes is an error, also where the job does not say so
+/// @param notesFile  the file that the notes are to be written to; empty for none. One that is needed for the job is an error
 CheckedFile checkJob(const QString &file, Expected<JsonSource> source, const QStringList &sets, bool isStrict,
-                     Progress &progress);
+                     const QString &notesFile, Progress &progress);
 
 } // namespace kareport

@@ -280,6 +280,39 @@ TEST(CommandLineCheck, WritesTheNotesAsRenderDoes)
     EXPECT_EQ(folder.run("check job.json --notes none/notes.json").status, 3);
 }
 
+TEST(CommandLineCheck, NotesReplaceNothingThatIsNeeded)
+{
+    struct Row
+    {
+        const char *line;
+        const char *contains;
+    };
+    constexpr Row rows[] = {
+        {"check job.json --notes job.json", "is the job itself"},
+        {"check job.json b.json --notes {}.json", "is the job itself"},
+        {"check job.json --notes points.csv", "is data of the job"},
+        {"check job.json --notes t.xml", "is the template"},
+        {"check other.xml job.json --notes other.xml", "is the template"},
+        {"check job.json sub/job.json --notes {}-notes.json", "already"},
+    };
+    for (const Row &row : rows) {
+        const CommandLineFolder folder;
+        folder.put("b.json", folder.bytesOf("job.json"));
+        folder.put("other.xml", folder.bytesOf("t.xml"));
+        const QStringList before = folder.names();
+        const QByteArray kept[] = {folder.bytesOf("job.json"), folder.bytesOf("points.csv"), folder.bytesOf("t.xml")};
+        const ProgramRun run = folder.run(row.line);
+        EXPECT_EQ(run.status, 2) << row.line << run.all().constData();
+        EXPECT_TRUE(run.all().contains(row.contains)) << row.line << run.all().constData();
+        EXPECT_EQ(folder.names(), before) << row.line;
+        EXPECT_EQ(folder.bytesOf("job.json"), kept[0]) << row.line;
+        EXPECT_EQ(folder.bytesOf("b.json"), kept[0]) << row.line;
+        EXPECT_EQ(folder.bytesOf("points.csv"), kept[1]) << row.line;
+        EXPECT_EQ(folder.bytesOf("t.xml"), kept[2]) << row.line;
+        EXPECT_EQ(folder.bytesOf("other.xml"), kept[2]) << row.line;
+    }
+}
+
 TEST(CommandLineCheck, WhatIsWrongOnTheCommandLineIsStatus1)
 {
     const CommandLineFolder folder;
