@@ -44,10 +44,15 @@ QString outputIdentity(const Output &output)
 
 std::optional<OutputClash> outputClash(const Job &job, const QString &path)
 {
+    return outputClash(job, job.outputs, path);
+}
+
+std::optional<OutputClash> outputClash(const Job &job, const std::vector<Output> &outputs, const QString &path)
+{
     const QHash<QString, QString> sources = sourcesOf(job, path);
     QHash<QString, const Output *> earlier;
-    for (qsizetype i = 0; i < qsizetype(job.outputs.size()); ++i) {
-        const Output &output = job.outputs[static_cast<std::size_t>(i)];
+    for (qsizetype i = 0; i < qsizetype(outputs.size()); ++i) {
+        const Output &output = outputs[static_cast<std::size_t>(i)];
         const QString identity = outputIdentity(output);
         if (identity.isEmpty()) {
             continue;

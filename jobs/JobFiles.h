@@ -22,6 +22,8 @@ QString outputIdentity(const Output &output);
 /// The first output of a job that is the job file, its template or its data, or that another output is already.
 /// @param path  the job file; empty for a job that is in no file
 std::optional<OutputClash> outputClash(const Job &job, const QString &path);
+/// The same for other outputs than the job's own.
+std::optional<OutputClash> outputClash(const Job &job, const std::vector<Output> &outputs, const QString &path);
 
 /// Whether every output of a job is a file that was written later than all that the job is made of was changed: the job
 /// file, its template file and its data files. A file with the very time of an output counts as changed after it. A job

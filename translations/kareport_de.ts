@@ -2243,23 +2243,8 @@
     </message>
     <message>
         <location filename="../apps/kareport/CheckCommand.cpp"/>
-        <source>kareport: "%1" could not be written: %2</source>
-        <translation>kareport: „%1“ konnte nicht geschrieben werden: %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CheckCommand.cpp"/>
         <source>standard input is one job: - was expected once</source>
         <translation>die Standardeingabe ist ein einziger Auftrag: - wurde einmal erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CheckCommand.cpp"/>
-        <source>--notes "%1": the name of a file was expected</source>
-        <translation>--notes "%1": der Name einer Datei wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CheckCommand.cpp"/>
-        <source>--notes "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
-        <translation>--notes "%1" ist eine Datei für mehrere Aufträge: ein Name mit {} wurde erwartet, was für den Namen der Auftragsdatei steht</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CheckCommand.cpp"/>
@@ -2406,6 +2391,21 @@
         <location filename="../apps/kareport/DataOptions.cpp"/>
         <source>--columns "%1": the names of the columns in their order, or VARIABLE=COLUMN for each, were expected</source>
         <translation>--columns "%1": die Namen der Spalten in ihrer Reihenfolge oder VARIABLE=SPALTE für jede wurden erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/NotesFile.cpp"/>
+        <source>--notes "%1": the name of a file was expected</source>
+        <translation>--notes "%1": der Name einer Datei wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/NotesFile.cpp"/>
+        <source>--notes "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
+        <translation>--notes "%1" ist eine Datei für mehrere Aufträge: ein Name mit {} wurde erwartet, was für den Namen der Auftragsdatei steht</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/NotesFile.cpp"/>
+        <source>kareport: "%1" could not be written: %2</source>
+        <translation>kareport: „%1“ konnte nicht geschrieben werden: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>

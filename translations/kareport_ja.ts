@@ -2243,23 +2243,8 @@
     </message>
     <message>
         <location filename="../apps/kareport/CheckCommand.cpp"/>
-        <source>kareport: "%1" could not be written: %2</source>
-        <translation>kareport: 「%1」を書き込めませんでした: %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CheckCommand.cpp"/>
         <source>standard input is one job: - was expected once</source>
         <translation>標準入力は一つのジョブです: - は一度だけ指定できます</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CheckCommand.cpp"/>
-        <source>--notes "%1": the name of a file was expected</source>
-        <translation>--notes "%1": ファイル名が必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CheckCommand.cpp"/>
-        <source>--notes "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
-        <translation>--notes "%1" は複数のジョブに対して 1 つのファイルです: ジョブファイルの名前を表す {} を含む名前が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CheckCommand.cpp"/>
@@ -2406,6 +2391,21 @@
         <location filename="../apps/kareport/DataOptions.cpp"/>
         <source>--columns "%1": the names of the columns in their order, or VARIABLE=COLUMN for each, were expected</source>
         <translation>--columns "%1": 列の名前を順に並べたもの、または各列の 変数=列 が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/NotesFile.cpp"/>
+        <source>--notes "%1": the name of a file was expected</source>
+        <translation>--notes "%1": ファイル名が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/NotesFile.cpp"/>
+        <source>--notes "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
+        <translation>--notes "%1" は複数のジョブに対して 1 つのファイルです: ジョブファイルの名前を表す {} を含む名前が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/NotesFile.cpp"/>
+        <source>kareport: "%1" could not be written: %2</source>
+        <translation>kareport: 「%1」を書き込めませんでした: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>

@@ -5,7 +5,7 @@
 #include "FileIdentity.h"
 #include "Interrupt.h"
 #include "JobCheck.h"
-#include "ReplaceFile.h"
+#include "NotesFile.h"
 #include "TerminalProgress.h"
 #include "Xlate.h"
 
@@ -16,6 +16,7 @@
 #include <QJsonDocument>
 
 #include <algorithm>
+#include <iterator>
 #include <new>
 
 namespace kareport
@@ -50,23 +51,31 @@ CheckedFile noMemoryFor(const QString &file)
 /// The file for the notes on a job; empty where none is written.
 QString notesFileOf(const CheckCommand &command, const QString &job)
 {
-    return command.notes.value_or(QString()).replace(QStringLiteral("{}"), QFileInfo(job).completeBaseName());
+    return namedAfterJob(command.notes.value_or(QString()), job);
+}
+
+/// The job files among those that are checked. Some are looked into.
+QStringList jobsOf(const CheckCommand &command)
+{
+    QStringList jobs;
+    std::copy_if(command.files.begin(), command.files.end(), std::back_inserter(jobs), isJobFile);
+    return jobs;
 }
 
 /// What of the files that are checked the notes would replace, or which notes others.
-std::optional<QString> notesClash(const CheckCommand &command)
+std::optional<QString> notesClash(const CheckCommand &command, const QStringList &jobs)
 {
     QHash<QString, QString> taken;
     for (const QString &file : command.files) {
         if (file != u"-") {
             taken.insert(fileIdentity(file),
-                         isJobFile(file)
+                         jobs.contains(file)
                              ? Xlate("\"%1\" is the job itself: an output of its own was expected")
                              : Xlate("\"%1\" is the template of the job: an output of its own was expected"));
         }
     }
-    for (const QString &file : command.files) {
-        const QString notes = isJobFile(file) ? notesFileOf(command, file) : QString();
+    for (const QString &job : jobs) {
+        const QString notes = notesFileOf(command, job);
         const QString identity = notes.isEmpty() ? QString() : fileIdentity(notes);
         if (identity.isEmpty()) {
             continue;
@@ -80,28 +89,15 @@ std::optional<QString> notesClash(const CheckCommand &command)
     return std::nullopt;
 }
 
-CheckedFile checkFile(const CheckCommand &command, const QString &file, Progress &progress)
+CheckedFile checkFile(const CheckCommand &command, const QString &file, bool isJob, Progress &progress)
 {
     try {
-        return isJobFile(file) ? checkJob(file, JsonSource::read(file), command.sets, command.strict,
-                                          notesFileOf(command, file), progress)
-                               : checkTemplateFile(file);
+        return isJob ? checkJob(file, JsonSource::read(file), command.sets, command.strict, notesFileOf(command, file),
+                                progress)
+                     : checkTemplateFile(file);
     } catch (const std::bad_alloc &) {
         return noMemoryFor(file);
     }
-}
-
-/// @return whether the file with the notes on a job was written
-bool writeNotes(const CheckedFile &checked, const QString &file)
-{
-    const QByteArray json = checked.notes.toJson();
-    QString problem;
-    const bool isWritten = replaceFile(
-        file, [&json](QIODevice &device) { return device.write(json) == json.size(); }, &problem);
-    if (!isWritten) {
-        printError(Xlate("kareport: \"%1\" could not be written: %2").arg(file, problem));
-    }
-    return isWritten;
 }
 
 void printJson(const QJsonArray &list)
@@ -119,32 +115,23 @@ std::optional<QString> CheckCommand::usageError() const
     if (files.count(QStringLiteral("-")) > 1) {
         return Xlate("standard input is one job: - was expected once");
     }
-    if (notes && (notes->isEmpty() || *notes == u"-")) {
-        return Xlate("--notes \"%1\": the name of a file was expected").arg(*notes);
-    }
-    const auto jobs = std::count_if(files.begin(), files.end(), isJobFile);
-    if (notes && jobs > 1 && !notes->contains(QStringLiteral("{}"))) {
-        return Xlate("--notes \"%1\" is one file for several jobs: a name with {} was expected, which stands for the "
-                     "name of the job file")
-            .arg(*notes);
-    }
-    return std::nullopt;
+    return notes ? wrongNotesFile(notes, jobsOf(*this).size() > 1) : std::nullopt;
 }
 
 ExitStatus CheckCommand::run(int &argc, char **argv) const
 {
-    if (const auto clash = notesClash(*this)) {
+    const QStringList jobs = jobsOf(*this);
+    if (const auto clash = notesClash(*this, jobs)) {
         printError(QStringLiteral("kareport: ") + *clash);
         return exitInput;
     }
     // A job's page may be measured, which takes fonts.
-    const bool hasJobs = std::any_of(files.begin(), files.end(), isJobFile);
-    const auto application = hasJobs ? startQt(argc, argv, true) : nullptr;
+    const auto application = !jobs.isEmpty() ? startQt(argc, argv, true) : nullptr;
     TerminalProgress bar(progress);
     ExitStatus status = exitDone;
     QJsonArray all;
     for (const QString &file : files) {
-        const CheckedFile checked = checkFile(*this, file, bar);
+        const CheckedFile checked = checkFile(*this, file, jobs.contains(file), bar);
         if (checked.wrongSet) {
             return usageExit(*checked.wrongSet);
         }
@@ -159,7 +146,7 @@ ExitStatus CheckCommand::run(int &argc, char **argv) const
         }
         status = std::max(status, checked.hasErrors() ? exitInput : exitDone);
         const bool isNoted = notes && checked.isJob && !checked.isNotesFileNeeded;
-        if (isNoted && !writeNotes(checked, notesFileOf(*this, file))) {
+        if (isNoted && !writeNotesFile(checked.notes, notesFileOf(*this, file))) {
             status = std::max(status, exitOutput);
         }
     }

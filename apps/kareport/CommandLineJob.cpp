@@ -6,15 +6,13 @@
 #include "JobFiles.h"
 #include "JobReader.h"
 #include "LeastSize.h"
+#include "NotesFile.h"
 #include "ProcessSetup.h"
-#include "ReplaceFile.h"
 #include "ReportTextCodec.h"
 #include "Signals.h"
 #include "SizeLimit.h"
 #include "TerminalProgress.h"
 #include "Xlate.h"
-
-#include <QFileInfo>
 
 #include <algorithm>
 #include <new>
@@ -57,10 +55,8 @@ void CommandLineJob::takeOutputs(std::optional<OutputKind> kindOtherwise)
 {
     if (!command_.outputs.isEmpty()) {
         job_.outputs.clear();
-        for (QString file : command_.outputs) {
-            if (!source_.path().isEmpty()) {
-                file.replace(QStringLiteral("{}"), QFileInfo(source_.path()).completeBaseName());
-            }
+        for (const QString &output : command_.outputs) {
+            const QString file = namedAfterJob(output, source_.path());
             job_.outputs.push_back({file, *outputKindOf(file, kindOtherwise)});
         }
     } else if (job_.outputs.empty()) {
@@ -74,9 +70,7 @@ void CommandLineJob::takeOutputs(std::optional<OutputKind> kindOtherwise)
 /// The file that the notes go to; empty for none.
 QString CommandLineJob::notesFile() const
 {
-    QString file = command_.notes.value_or(QString());
-    return source_.path().isEmpty() ? file
-                                    : file.replace(QStringLiteral("{}"), QFileInfo(source_.path()).completeBaseName());
+    return namedAfterJob(command_.notes.value_or(QString()), source_.path());
 }
 
 /// No output may replace what the report is made of, or another output.
@@ -85,9 +79,9 @@ void CommandLineJob::checkOutputs()
     const auto clash = outputClash(job_, source_.path());
     if (!clash) {
         // Notes are an output as well, though no job has them among its own.
-        Job withNotes = job_;
-        withNotes.outputs.push_back({notesFile(), OutputKind::Text});
-        const auto other = command_.notes ? outputClash(withNotes, source_.path()) : std::nullopt;
+        std::vector<Output> withNotes = job_.outputs;
+        withNotes.push_back({notesFile(), OutputKind::Text});
+        const auto other = command_.notes ? outputClash(job_, withNotes, source_.path()) : std::nullopt;
         if (other) {
             fail(other->text);
         }
@@ -194,20 +188,7 @@ void CommandLineJob::sayNotes(const JobNotes &notes, const std::optional<InputEr
             printError(isError ? note.about.message() : note.message());
         }
     }
-    areNotesWritten_ = !command_.notes || writeNotes(notes);
-}
-
-/// @return whether the file with the notes was written
-bool CommandLineJob::writeNotes(const JobNotes &notes)
-{
-    const QByteArray json = notes.toJson();
-    QString problem;
-    const bool isWritten = replaceFile(
-        notesFile(), [&json](QIODevice &device) { return device.write(json) == json.size(); }, &problem);
-    if (!isWritten) {
-        printError(Xlate("kareport: \"%1\" could not be written: %2").arg(notesFile(), problem));
-    }
-    return isWritten;
+    areNotesWritten_ = !command_.notes || writeNotesFile(notes, notesFile());
 }
 
 /// Writes the report directly into its output. @return nothing, and nothing made, when the output cannot be opened

@@ -35,7 +35,6 @@ private:
     std::optional<InputError> make(JobRunner &runner, UReportDoc &report, ReportTextWriter *stream);
     void sayNotes(const JobNotes &notes, const std::optional<InputError> &error);
     ExitStatus withNotes(ExitStatus status) const;
-    bool writeNotes(const JobNotes &notes);
     QString notesFile() const;
     void takeOutputs(std::optional<OutputKind> kindOtherwise);
     void checkOutputs();

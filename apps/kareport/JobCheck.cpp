@@ -75,7 +75,6 @@ void runJob(Job job, const JsonSource &source, bool isStrict, CheckedFile &check
     NoDevice device;
     ReportTextWriter writer(device, LineEnds::PlainText);
     const auto error = runner.run(report, &writer);
-    report.StreamText(nullptr);
     progress.finish();
     addNotes(checked, runner.notes(), isStrict);
     checked.steps = runner.fits();
@@ -130,9 +129,7 @@ CheckedFile checkJob(const QString &file, Expected<JsonSource> source, const QSt
         checked.add(true, json.errorAt({QStringLiteral("output"), clash->output}, clash->text));
     }
     if (!notesFile.isEmpty()) {
-        Job withNotes = job;
-        withNotes.outputs = {{notesFile, OutputKind::Text}};
-        if (const auto clash = outputClash(withNotes, json.path())) {
+        if (const auto clash = outputClash(job, {{notesFile, OutputKind::Text}}, json.path())) {
             checked.isNotesFileNeeded = true;
             checked.add(true, {json.path(), std::nullopt, clash->text});
         }

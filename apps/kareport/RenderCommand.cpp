@@ -4,6 +4,7 @@
 #include "CommandSetup.h"
 #include "JobFiles.h"
 #include "JobList.h"
+#include "NotesFile.h"
 #include "RenderBatch.h"
 #include "SizeLimit.h"
 #include "TerminalProgress.h"
@@ -73,15 +74,7 @@ std::optional<QString> RenderCommand::wrongOutputs() const
                 .arg(file);
         }
     }
-    if (notes && (notes->isEmpty() || *notes == u"-")) {
-        return Xlate("--notes \"%1\": the name of a file was expected").arg(*notes);
-    }
-    if (notes && isBatch() && !notes->contains(QStringLiteral("{}"))) {
-        return Xlate("--notes \"%1\" is one file for several jobs: a name with {} was expected, which stands for the "
-                     "name of the job file")
-            .arg(*notes);
-    }
-    return std::nullopt;
+    return wrongNotesFile(notes, isBatch());
 }
 
 /// The job file, or what the short form stands for.
