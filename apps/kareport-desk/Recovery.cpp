@@ -169,13 +169,15 @@ QString Recovery::textFileOf(const UReportDoc &report)
     Written &written = written_[&report];
     const auto *window = dynamic_cast<UReportWindowDlg *>(report.GetReportWindow());
     const bool isBeingWritten = window != nullptr && window->isCreated() && !window->IsActive();
-    if (isBeingWritten || (written.edits == report.GetEditCount() && written.length == report.GetTextLength())) {
+    const UReportView *view = formattedView(report);
+    const bool isSame = written.edits == report.GetEditCount() && written.length == report.GetTextLength() &&
+                        written.isFormatted == (view != nullptr); // formats go with the view that has them
+    if (isBeingWritten || isSame) {
         return written.length < 0 ? QString() : written.file;
     }
     if (written.file.isEmpty()) {
         written.file = QString::number(++lastNumber_);
     }
-    const UReportView *view = formattedView(report);
     const bool isWritten = folder_->write(written.file, [&report, view](QIODevice &device) {
         if (view != nullptr) {
             return view->streamRichText(device);
@@ -188,6 +190,7 @@ QString Recovery::textFileOf(const UReportDoc &report)
     }
     written.edits = report.GetEditCount();
     written.length = report.GetTextLength();
+    written.isFormatted = view != nullptr;
     written.pageLines = {};
     for (const qint64 line : view != nullptr ? std::vector<qint64>() : report.GetPageStartLines()) {
         written.pageLines.append(line);

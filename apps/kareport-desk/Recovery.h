@@ -52,6 +52,7 @@ private:
         QString file;
         quint64 edits = 0;
         qint64 length = -1;
+        bool isFormatted = false; ///< by a view, whose formats are not in the report's text
         QJsonArray pageLines;
     };
 

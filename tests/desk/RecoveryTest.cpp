@@ -1,8 +1,10 @@
+#include "COneViewPane.h"
 #include "DeskFixture.h"
 
 #include "CrashFolder.h"
 #include "FrameFixture.h"
 #include "Recovery.h"
+#include "ReportCommandIds.h"
 #include "ReportEdit.h"
 #include "ReportPages.h"
 #include "ReportViewWidget.h"
@@ -136,6 +138,41 @@ TEST(Recovery, FormatsOfAnEditedRichTextComeBack)
     QTextCursor cursor(edit.document());
     cursor.setPosition(3);
     EXPECT_EQ(cursor.charFormat().fontWeight(), QFont::Bold);
+}
+
+// Formats are in the view alone: when that is closed, the report is the text that its other views show. What was kept
+// before would bring back another one.
+TEST(Recovery, FormatsGoWithTheViewThatHasThem)
+{
+    const CrashFolder folder;
+    QString text;
+    {
+        Desk desk;
+        desk.answer = MessageAnswer::No;
+        auto recovery = std::make_unique<Recovery>(folder.path());
+        UReportDoc *report = makeReport(QStringLiteral("R"), QStringLiteral("{\\rtf1 {\\b bold}}"));
+        auto *formatted = dynamic_cast<UReportView *>(report->GetViews().front());
+        QTest::keyClick(&formatted->GetEdit(), Qt::Key_X);
+        recovery->keep();
+        ASSERT_TRUE(formatted->ShowsFormats());
+        desk.frame->OnCommand(kareport::windowNewCommand);
+        ASSERT_EQ(report->GetViews().size(), 2U);
+        dynamic_cast<COneViewPane *>(formatted->GetParentPane())->GetDock()->close();
+        QCoreApplication::processEvents();
+        ASSERT_EQ(report->GetViews().size(), 1U);
+        ASSERT_FALSE(dynamic_cast<UReportView *>(report->GetViews().front())->ShowsFormats());
+        text = report->CopyText();
+        recovery->keep();
+        folder.crash(std::move(recovery));
+    }
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    Recovery recovery(folder.path());
+    ASSERT_EQ(recovery.leftReports().size(), 1U);
+    const UReportDoc *report = kareport::reopenReport(recovery.leftReports().front());
+    ASSERT_NE(report, nullptr);
+    EXPECT_EQ(report->CopyText(), text);
+    recovery.discardLeft();
 }
 
 TEST(Recovery, AReportHasTheNameThatTheUserKnows)
