@@ -353,6 +353,11 @@ void exitDesk(World &world, Chance &chance)
     }
 }
 
+void keep(World &world, Chance & /*chance*/)
+{
+    world.keep();
+}
+
 void crash(World &world, Chance &chance)
 {
     if (chance.oneIn(2)) {
@@ -408,6 +413,7 @@ const std::vector<Action> &allActions()
         {"time", 1, false, letTimePass},
         {"editor", 1, false, chooseEditor},
         {"end-editor", 1, false, endEditor},
+        {"keep", 6, false, keep},
         {"exit", 2, false, exitDesk},
         {"crash", 1, false, crash},
         {"fail-files", 2, true, failFiles},

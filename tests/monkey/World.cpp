@@ -274,10 +274,8 @@ QString World::newPath(Chance &chance) const
     return files().filePath(names.at(chance.below(names.size())));
 }
 
-void World::crash()
+void World::keep()
 {
-    limitFiles(-1); // what cannot be kept cannot come back
-    // What the desk does every few seconds: what is open is on the disk after it.
     for (QTimer *timer : frame_->findChildren<QTimer *>()) {
         constexpr int keepInterval = 5000;
         if (timer->interval() == keepInterval) {
@@ -285,6 +283,12 @@ void World::crash()
             QCoreApplication::sendEvent(timer, &due);
         }
     }
+}
+
+void World::crash()
+{
+    limitFiles(-1); // what cannot be kept cannot come back
+    keep();
     QJsonArray expected;
     for (const UReportDoc *report : reports()) {
         const bool hasFormats = std::any_of(report->GetViews().begin(), report->GetViews().end(), [](UView *view) {

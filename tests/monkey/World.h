@@ -76,6 +76,8 @@ public:
 
     /// Lets the clock go on, so that what looks at times does.
     void wait(int milliseconds);
+    /// Does what the desk does every few seconds: what is open is on the disk after it.
+    void keep();
     /// The desk has written down what is open, and dies.
     [[noreturn]] void crash();
     /// Whether reports that were lost in a crash have come back. @return what is wrong
