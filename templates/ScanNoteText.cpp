@@ -1,5 +1,6 @@
 #include "ScanNoteText.h"
 
+#include "NearestName.h"
 #include "TagLint.h"
 #include "Xlate.h"
 
@@ -14,8 +15,7 @@ QString bracketedTag(QStringView tag)
 QString quotedValue(const ScanElement &element)
 {
     constexpr qsizetype longestQuote = 60;
-    const QString &text = element.value.text();
-    return u'"' + (text.size() > longestQuote ? text.left(longestQuote) + u'…' : text) + u'"';
+    return u'"' + shortened(element.value.text(), longestQuote) + u'"';
 }
 
 bool isScanError(const ScanNote &note)

@@ -45,6 +45,17 @@ qsizetype distanceOf(QStringView left, QStringView right)
     return rows[static_cast<std::size_t>(left.size() % 3)].back();
 }
 
+/// Names for a message, not all of very many.
+QString listed(const QStringList &names)
+{
+    constexpr qsizetype mostNames = 40;
+    QStringList shown = names.mid(0, mostNames);
+    if (names.size() > mostNames) {
+        shown.append(QStringLiteral("…"));
+    }
+    return shown.join(QStringLiteral(", "));
+}
+
 } // namespace
 
 QString nearestName(QStringView misspelt, const QStringList &known)
@@ -78,14 +89,26 @@ QString withQuestion(const QString &sentence, QStringView misspelt, const QStrin
     return question.isEmpty() ? sentence : sentence + QStringLiteral(": ") + question;
 }
 
+QString shortened(const QString &text, qsizetype most)
+{
+    if (text.size() <= most) {
+        return text;
+    }
+    const bool isHalved = most > 0 && text[most - 1].isHighSurrogate() && text[most].isLowSurrogate();
+    return text.left(isHalved ? most - 1 : most) + u'…';
+}
+
+QString withExpected(const QString &sentence, QStringView misspelt, const QStringList &known)
+{
+    const QString question = withQuestion(sentence, misspelt, known);
+    return known.isEmpty() || question.size() > sentence.size()
+               ? question
+               : sentence + QStringLiteral(": ") + Xlate("one of %1 was expected").arg(listed(known));
+}
+
 QString oneOfExpected(QStringView given, const QStringList &known)
 {
-    constexpr qsizetype mostNames = 40;
-    QStringList shown = known.mid(0, mostNames);
-    if (known.size() > mostNames) {
-        shown.append(QStringLiteral("…"));
-    }
-    const QString all = shown.isEmpty() ? Xlate("none") : shown.join(QStringLiteral(", "));
+    const QString all = known.isEmpty() ? Xlate("none") : listed(known);
     const QString question = didYouMean(given, known);
     const QString expected = Xlate("one of %1 was expected").arg(all);
     return question.isEmpty() ? expected : expected + QStringLiteral("; ") + question;

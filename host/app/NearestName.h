@@ -2,6 +2,7 @@
 
 #include <QString>
 #include <QStringList>
+#include <QStringView>
 
 namespace kareport
 {
@@ -15,6 +16,14 @@ QString didYouMean(QStringView misspelt, const QStringList &known);
 
 /// A sentence with such a question after it, where a name is near: `there is no "Elev": did you mean "Elevation"?`
 QString withQuestion(const QString &sentence, QStringView misspelt, const QStringList &known);
+
+/// A sentence with what would have been right after it: the nearest name as a question, or else all of them. Nothing is added
+/// where there are no names.
+QString withExpected(const QString &sentence, QStringView misspelt, const QStringList &known);
+
+/// A text for a message, with an ellipsis in the place of what is beyond a number of characters. No character outside the basic
+/// plane is halved.
+QString shortened(const QString &text, qsizetype most);
 
 /// What would have been right: `one of m, ft was expected`, or `none` where there are no names, with a question after it
 /// where a name is near.

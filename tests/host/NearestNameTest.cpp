@@ -7,6 +7,7 @@ namespace
 
 using kareport::didYouMean;
 using kareport::nearestName;
+using kareport::shortened;
 
 TEST(NearestName, FindsWhatWasProbablyMeant)
 {
@@ -62,6 +63,23 @@ TEST(NearestName, SaysWhatWouldHaveBeenRight)
     EXPECT_EQ(kareport::withQuestion(QStringLiteral("wrong"), u"Elev", {"Elevation"}).toStdString(),
               "wrong: did you mean \"Elevation\"?");
     EXPECT_EQ(kareport::withQuestion(QStringLiteral("wrong"), u"Zzz", {"Elevation"}).toStdString(), "wrong");
+}
+
+TEST(NearestName, TextsAreShortenedBetweenCharacters)
+{
+    EXPECT_EQ(shortened(QStringLiteral("abc"), 3), u"abc");
+    EXPECT_EQ(shortened(QStringLiteral("abcd"), 3), u"abc…");
+    EXPECT_EQ(shortened(QStringLiteral("ab\U0001F600d"), 3), u"ab…") << "half a character is none";
+    EXPECT_EQ(shortened(QStringLiteral("ab\U0001F600d"), 4), u"ab\U0001F600…");
+    EXPECT_EQ(shortened(QString(), 0), u"");
+}
+
+TEST(NearestName, WhatWouldHaveBeenRightFollowsASentence)
+{
+    using kareport::withExpected;
+    EXPECT_EQ(withExpected(QStringLiteral("wrong"), u"Elev", {"Elevation"}), u"wrong: did you mean \"Elevation\"?");
+    EXPECT_EQ(withExpected(QStringLiteral("wrong"), u"Zzz", {"Elevation"}), u"wrong: one of Elevation was expected");
+    EXPECT_EQ(withExpected(QStringLiteral("wrong"), u"Zzz", {}), u"wrong");
 }
 
 } // namespace
