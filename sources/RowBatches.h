@@ -1,6 +1,7 @@
 #pragma once
 
 #include "InputError.h"
+#include "RowReader.h"
 #include "UDataObject.h"
 
 #include <array>
@@ -25,6 +26,7 @@ struct RowBatch
     bool isLast = false;              ///< no row follows, or none that can be read
     std::optional<InputError> error;  ///< what is wrong with the row after the last
     std::size_t position = 0;         ///< where reading has come to in the file
+    RowPlace first;                   ///< where the first row is, of a source that can seek
 
     /// The object after those in use.
     UDataObject &next()

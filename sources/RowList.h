@@ -26,6 +26,13 @@ struct SourceColumns
     QStringList variables; ///< the names of the variables that are read, folded, each once
 };
 
+/// Where a value was read from.
+struct ValuePlace
+{
+    QString file;                                  ///< what messages call the source; empty where it is not known
+    std::optional<TextPlace> place = std::nullopt; ///< that of the row where it has no value; nothing for a database
+};
+
 /// The rows of a data source as data objects, made while they are asked for in turn. When something is wrong with a row, or
 /// reading is stopped, the list ends there.
 class RowList : public UDataObjectList
@@ -38,6 +45,11 @@ public:
     /// The columns; nothing while they are not known, as those of a source that shows them with its rows are known after the
     /// last one only. Asked when the list has been made and when it has come to its end.
     virtual std::optional<SourceColumns> columns() const { return std::nullopt; }
+
+    /// Where the value of a variable of a row was read from. Asked when the list has come to its end; rows that are asked for
+    /// after that are read again.
+    /// @param index  of the row, in the order that the list has
+    virtual ValuePlace placeOf(std::size_t /*index*/, const QString & /*variable*/) { return {}; }
 
     /// What there is to say of a source whose rows are sound. One with a place tells what does not fit together in the
     /// source, one without what the source holds that no list reads. Nothing before the list has come to its end.

@@ -1,9 +1,11 @@
 #include "RowObjectList.h"
 
 #include "EntryOrder.h"
+#include "TextFolding.h"
 #include "WideVectors.h"
 
 #include <algorithm>
+#include <iterator>
 #include <numeric>
 
 namespace kareport
@@ -58,6 +60,37 @@ std::optional<SourceColumns> RowObjectList::columns() const
     return SourceColumns{reader_->name(), reader_->columns(), reader_->variables()};
 }
 
+ValuePlace RowObjectList::placeOf(std::size_t index, const QString &variable)
+{
+    ValuePlace found = {reader_->name()};
+    if (!reader_->canSeek()) {
+        return found;
+    }
+    batches_.reset();
+    batch_ = nullptr;
+    std::size_t row = index;
+    if (order_ && index < order_->size()) {
+        reader_->seek((*order_)[index]);
+    } else {
+        const auto after = std::upper_bound(batchPlaces_.begin(), batchPlaces_.end(), index,
+                                            [](std::size_t sought, const auto &batch) { return sought < batch.first; });
+        if (order_ || after == batchPlaces_.begin()) {
+            return found;
+        }
+        row = std::prev(after)->first;
+        reader_->seek(std::prev(after)->second);
+    }
+    static const std::vector<unsigned> nothing;
+    UDataObject object;
+    while (row < index && reader_->next(object, &nothing)) {
+        ++row;
+    }
+    if (row == index) {
+        found.place = reader_->placeOfNext(foldedKey(variable));
+    }
+    return found;
+}
+
 /// Goes back to the first row, with no batch read.
 void RowObjectList::restart()
 {
@@ -69,6 +102,7 @@ void RowObjectList::restart()
     error_.reset();
     batch_ = nullptr;
     batchStart_ = 0;
+    batchPlaces_.clear();
 }
 
 /// Why the rows end where they do. What was cut off a file while it was read shows as rows that are wrong.
@@ -82,12 +116,16 @@ std::optional<InputError> RowObjectList::endOfRows(const std::optional<InputErro
 bool RowObjectList::takeBatch()
 {
     if (batch_->isLast) {
-        error_ = endOfRows(batch_->error);
+        // The thread that reads ahead has ended with the last batch: the source is read by this one.
+        error_ = endOfRows(batch_->error && order_ && !spool_ ? firstError(batch_->error) : batch_->error);
         return false;
     }
     batchStart_ += batch_->count;
     batch_ = &batches_->next();
     position_ = batch_->position;
+    if (reader_->canSeek() && !order_ && batch_->count > 0) {
+        batchPlaces_.emplace_back(batchStart_, batch_->first);
+    }
     stopped_ = stopped_ || (progress_ && !progress_(position_));
     return !stopped_;
 }
@@ -129,22 +167,27 @@ bool RowObjectList::readRow(RowBatch &batch, std::size_t &bytes)
     }
     endWideVectors();
     if (!reader_->next(batch.next(), nullptr)) {
-        batch.error = order_ ? firstError() : reader_->error();
+        batch.error = reader_->error();
         return false;
     }
     bytes += reader_->rowBytes();
-    ++batch.count;
+    if (batch.count++ == 0) {
+        batch.first = reader_->place();
+    }
     return true;
 }
 
 /// What is wrong with the first row of the source that is wrong, which in a sorted list is not the first that is met: sorting
-/// has looked at the sort keys alone.
-std::optional<InputError> RowObjectList::firstError()
+/// has looked at the sort keys alone. Nothing when work is to stop.
+/// @param met  what is wrong with the row that was met
+std::optional<InputError> RowObjectList::firstError(const std::optional<InputError> &met)
 {
-    const auto met = reader_->error();
     reader_->rewind();
     UDataObject object;
-    while (reader_->next(object, nullptr)) {
+    for (std::size_t rows = 1; reader_->next(object, nullptr); ++rows) {
+        if (rows % RowBatch::most == 0 && isToStop(reader_->position())) {
+            return std::nullopt;
+        }
     }
     return reader_->error() ? reader_->error() : met;
 }

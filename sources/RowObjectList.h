@@ -7,6 +7,7 @@
 
 #include <memory>
 #include <optional>
+#include <utility>
 #include <vector>
 
 namespace kareport
@@ -28,6 +29,7 @@ public:
 
     std::optional<InputError> error() const override { return error_; }
     std::optional<SourceColumns> columns() const override;
+    ValuePlace placeOf(std::size_t index, const QString &variable) override;
     /// The source, for what it tells about its columns.
     const RowReader &reader() const { return *reader_; }
 
@@ -43,7 +45,7 @@ private:
     bool seekNext();
     bool readRow(RowBatch &batch, std::size_t &bytes);
     bool readFromSpool(RowBatch &batch, std::size_t &bytes);
-    std::optional<InputError> firstError();
+    std::optional<InputError> firstError(const std::optional<InputError> &met);
     bool takeBatch();
     void poll();
     bool isToStop(std::size_t position);
@@ -59,8 +61,9 @@ private:
     std::optional<std::vector<RowPlace>> order_; ///< of a sorted list
     std::size_t nextOrdered_ = 0;                ///< the row of `order_` that is read next
     const RowBatch *batch_ = nullptr;
-    std::size_t batchStart_ = 0; ///< index of the batch's first row
-    std::size_t position_ = 0;   ///< where reading had come to with the last batch
+    std::size_t batchStart_ = 0;                                ///< index of the batch's first row
+    std::vector<std::pair<std::size_t, RowPlace>> batchPlaces_; ///< the first rows of batches and where they are
+    std::size_t position_ = 0;                                  ///< where reading had come to with the last batch
     std::optional<InputError> error_;
     bool stopped_ = false;
     std::unique_ptr<RowBatches> batches_; ///< last, so that its thread ends before what it reads goes

@@ -48,6 +48,9 @@ public:
     /// The place of the row that was read last.
     virtual RowPlace place() const { return {}; }
     virtual void seek(const RowPlace & /*place*/) {}
+    /// Reads the next row again for the place of the value of a variable; that of the row where it has none. Only of a source
+    /// that can seek. @param variable  folded
+    virtual std::optional<TextPlace> placeOfNext(const QString & /*variable*/) { return std::nullopt; }
 
     /// Whether the next row may be long in coming, so that waiting for it must end when work is to stop.
     virtual bool mayWait() const { return false; }

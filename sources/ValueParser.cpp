@@ -173,6 +173,17 @@ bool ValueParser::storeNumber(double number, UDictionary &object) const
 
 bool ValueParser::storeInteger(qint64 number, UDictionary &object) const
 {
+    return storeDigits(number, object);
+}
+
+bool ValueParser::storeInteger(quint64 number, UDictionary &object) const
+{
+    return storeDigits(number, object);
+}
+
+template <typename Integer>
+bool ValueParser::storeDigits(Integer number, UDictionary &object) const
+{
     switch (form_) {
     case Form::Text: object.Refill<QString>(id_) = QString::number(number); return true;
     case Form::PointNumber: object.Refill<UPointNumber>(id_).text() = QString::number(number); return true;

@@ -44,6 +44,7 @@ public:
     bool storeNumber(double number, UDictionary &object) const;
     /// The same for a whole number, which a text shows with all its digits.
     bool storeInteger(qint64 number, UDictionary &object) const;
+    bool storeInteger(quint64 number, UDictionary &object) const;
     bool storeBoolean(bool value, UDictionary &object) const;
 
     /// What a text of the type looks like, for a message that says what was expected.
@@ -70,6 +71,8 @@ private:
     bool isAngle() const { return form_ >= Form::Angle; }
     bool storePlain(std::string_view text, UDictionary &object) const;
     bool storeAngle(std::string_view text, UDictionary &object) const;
+    template <typename Integer>
+    bool storeDigits(Integer number, UDictionary &object) const;
 
     Form form_;
     unsigned id_;

@@ -65,6 +65,18 @@ void JsonFileRows::seek(const RowPlace &place)
     released_ = text_.size(); // rows in another order come back to what was read
 }
 
+std::optional<TextPlace> JsonFileRows::placeOfNext(const QString &variable)
+{
+    const qsizetype number = keys_.variables().indexOf(variable);
+    sought_ = number >= 0 ? std::optional(static_cast<std::size_t>(number)) : std::nullopt;
+    soughtValue_.reset();
+    static const std::vector<unsigned> nothing;
+    UDataObject object;
+    const bool isRead = next(object, &nothing);
+    sought_.reset();
+    return isRead ? std::optional(placeOf(soughtValue_.value_or(row_.start))) : std::nullopt;
+}
+
 /// Goes over blanks. @return whether there was a line end
 bool JsonFileRows::skipBlanks()
 {
@@ -130,7 +142,7 @@ bool JsonFileRows::endList()
 /// Looks at the end whether what was asked for was there. @return false
 bool JsonFileRows::endRows()
 {
-    isComplete_ = true;
+    isComplete_ = rowNumber_ > 0; // without an object nobody knows what keys there would be
     const auto wrong = rowNumber_ > 0 ? keys_.whatIsMissing(columns_) : std::nullopt;
     if (wrong) {
         error_ = InputError{file_->path(), std::nullopt, *wrong};

@@ -35,6 +35,7 @@ public:
     bool canSeek() const override { return true; }
     RowPlace place() const override { return row_; }
     void seek(const RowPlace &place) override;
+    std::optional<TextPlace> placeOfNext(const QString &variable) override;
 
 private:
     enum class Before
@@ -51,6 +52,7 @@ private:
     bool storeAll(const std::function<bool(const ValueParser &)> &store);
     bool isWanted(unsigned id) const;
     bool fail(std::size_t at, const QString &text);
+    std::size_t startOfValue() const;
     bool failInValue(const JsonKeys::Field &field);
     std::size_t start() const;
     std::size_t startOfKey(std::size_t end) const;
@@ -60,6 +62,7 @@ private:
     bool onNull() override { return true; }
     bool onBoolean(bool value) override;
     bool onInteger(qint64 value) override;
+    bool onUnsigned(quint64 value) override;
     bool onNumber(double value) override;
     bool onText(std::string_view text) override;
     bool onNested() override;
@@ -73,7 +76,7 @@ private:
     qsizetype line_ = 1; ///< that `position_` is in
     Before before_ = Before::First;
     bool isList_ = false;
-    bool isComplete_ = false; ///< the end was seen, and so every key
+    bool isComplete_ = false; ///< the end of some objects was seen, and so every key
     RowPlace row_;
     std::size_t knownAt_ = 0; ///< a byte whose place is known
     TextPlace knownPlace_;
@@ -85,7 +88,9 @@ private:
     const std::vector<unsigned> *onlyIds_ = nullptr;
     const std::vector<JsonKeys::Field> *fields_ = nullptr; ///< of the key
     std::size_t keyStart_ = 0;
-    std::size_t valueStart_ = 0; ///< after the key
+    std::size_t valueStart_ = 0;             ///< after the key
+    std::optional<std::size_t> sought_;      ///< the number of the variable whose value is looked for
+    std::optional<std::size_t> soughtValue_; ///< where it is
 };
 
 } // namespace kareport

@@ -29,6 +29,11 @@ bool JsonFileRows::onKey(std::string_view key, std::size_t end)
     if (found.isNew && columns_.size() < JsonKeys::most) {
         columns_.push_back({textOf(key), placeOf(keyStart_), !found.fields->empty()});
     }
+    for (const JsonKeys::Field &field : *fields_) {
+        if (sought_ && field.variable == *sought_) {
+            soughtValue_ = startOfValue();
+        }
+    }
     if (found.isRepeated) {
         return fail(keyStart_, Xlate("the key \"%1\" occurs twice in an object").arg(textOf(key)));
     }
@@ -76,6 +81,11 @@ bool JsonFileRows::onInteger(qint64 value)
     return storeAll([&](const ValueParser &parser) { return parser.storeInteger(value, *object_); });
 }
 
+bool JsonFileRows::onUnsigned(quint64 value)
+{
+    return storeAll([&](const ValueParser &parser) { return parser.storeInteger(value, *object_); });
+}
+
 bool JsonFileRows::onNumber(double value)
 {
     return storeAll([&](const ValueParser &parser) { return parser.storeNumber(value, *object_); });
@@ -96,13 +106,19 @@ void JsonFileRows::onMistake(const QString &text, std::size_t at)
     fail(at > row_.start ? at - 1 : at, Xlate("this is not JSON: %1").arg(text));
 }
 
-bool JsonFileRows::failInValue(const JsonKeys::Field &field)
+/// Where the value of the key begins.
+std::size_t JsonFileRows::startOfValue() const
 {
     std::size_t at = valueStart_;
     while (at < text_.size() && std::string_view(" \t\r\n:").find(text_[at]) != std::string_view::npos) {
         ++at;
     }
-    return fail(at,
+    return at;
+}
+
+bool JsonFileRows::failInValue(const JsonKeys::Field &field)
+{
+    return fail(startOfValue(),
                 Xlate("the value of \"%1\" does not fit: %2 was expected").arg(field.name, field.parser.expected()));
 }
 

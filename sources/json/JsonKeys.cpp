@@ -96,9 +96,7 @@ std::optional<QString> JsonKeys::whatIsMissing(const std::vector<SourceColumn> &
     for (std::size_t i = 0; i < choices_.size(); ++i) {
         if (!isChoiceFound_[i]) {
             const QString &name = std::get<QString>(choices_[i].column);
-            const QString question = didYouMean(name, names);
-            const QString sentence = Xlate("no object has the key \"%1\"").arg(name);
-            return question.isEmpty() ? sentence : sentence + QStringLiteral(": ") + question;
+            return withQuestion(Xlate("no object has the key \"%1\"").arg(name), name, names);
         }
     }
     if (!names_.isEmpty()) {

@@ -60,8 +60,8 @@ public:
     bool number_unsigned(std::uint64_t value)
     {
         constexpr auto most = static_cast<std::uint64_t>(std::numeric_limits<qint64>::max());
-        return depth_ > 1 || (value <= most ? handler_.onInteger(static_cast<qint64>(value))
-                                            : handler_.onNumber(static_cast<double>(value)));
+        return depth_ > 1 ||
+               (value <= most ? handler_.onInteger(static_cast<qint64>(value)) : handler_.onUnsigned(value));
     }
     bool number_float(double value, const std::string & /*text*/) { return depth_ > 1 || handler_.onNumber(value); }
     bool string(std::string &text) { return depth_ > 1 || handler_.onText(text); }

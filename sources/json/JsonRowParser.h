@@ -20,6 +20,7 @@ public:
     virtual bool onNull() = 0;
     virtual bool onBoolean(bool value) = 0;
     virtual bool onInteger(qint64 value) = 0;
+    virtual bool onUnsigned(quint64 value) = 0; ///< one that is too large for `onInteger`
     virtual bool onNumber(double value) = 0;
     virtual bool onText(std::string_view text) = 0;
     /// A list or an object, which is skipped.

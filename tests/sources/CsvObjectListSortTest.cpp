@@ -103,4 +103,26 @@ TEST(CsvObjectListSort, AMistakeInASortedFileHasItsPlace)
     }
 }
 
+TEST(CsvObjectListSort, LookingForTheFirstWrongRowCanBeStopped)
+{
+    // The row that is wrong comes first in the order, and last in the file: it is looked for from the beginning.
+    QByteArray content = "Number,Northing\n";
+    for (int i = 0; i < 20'000; ++i) {
+        content += QByteArray::number(i + 1) + ",1\n";
+    }
+    content += "0,x\n";
+    for (const bool isStopped : {false, true}) {
+        int calls = 0;
+        int most = 1'000'000;
+        const CsvFile file(content, [&](std::size_t) { return ++calls < most; });
+        file.list->Sort({numberId});
+        const int before = calls;
+        most = isStopped ? before + 2 : most; // the first is that of the batch
+        EXPECT_EQ(file.list->GetAt(0), nullptr);
+        EXPECT_EQ(file.list->error().has_value(), !isStopped) << "to be stopped is not a mistake of the data";
+        EXPECT_GE(calls - before, isStopped ? 2 : 8) << "it is asked for every so many rows";
+        EXPECT_LE(calls - before, isStopped ? 3 : 100);
+    }
+}
+
 } // namespace
