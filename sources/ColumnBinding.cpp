@@ -14,30 +14,16 @@ namespace kareport
 namespace
 {
 
-constexpr qsizetype mostNames = 40;
-
-/// A sentence with what would have been right: the nearest name, or all of them.
-QString withNames(const QString &sentence, const QString &name, const QStringList &known)
-{
-    const QString question = didYouMean(name, known);
-    if (!question.isEmpty()) {
-        return sentence + QStringLiteral(": ") + question;
-    }
-    const QStringList shown = known.mid(0, mostNames);
-    return shown.isEmpty() ? sentence
-                           : sentence + QStringLiteral(": ") +
-                                 Xlate("one of %1 was expected").arg(shown.join(QStringLiteral(", ")));
-}
-
-/// The first column that a choice means.
+/// The first column that a choice means. A number beyond the columns is the name of one, such as a year.
 std::optional<std::size_t> columnOf(const ColumnChoice &choice, const std::vector<SourceColumn> &columns)
 {
-    if (const int *number = std::get_if<int>(&choice.column)) {
-        const bool exists = *number >= 1 && static_cast<std::size_t>(*number) <= columns.size();
-        return exists ? std::optional(static_cast<std::size_t>(*number - 1)) : std::nullopt;
+    const int *number = std::get_if<int>(&choice.column);
+    if (number != nullptr && *number >= 1 && static_cast<std::size_t>(*number) <= columns.size()) {
+        return static_cast<std::size_t>(*number - 1);
     }
+    const QString name = number != nullptr ? QString::number(*number) : std::get<QString>(choice.column);
     for (std::size_t i = 0; i < columns.size(); ++i) {
-        if (equalFolded(columns[i].name, std::get<QString>(choice.column))) {
+        if (equalFolded(columns[i].name, name)) {
             return i;
         }
     }
@@ -50,7 +36,7 @@ QString noColumn(const ColumnChoice &choice, const std::vector<SourceColumn> &co
         return Xlate("there is no column %1: one of 1 to %2 was expected").arg(*number).arg(columns.size());
     }
     const QString &name = std::get<QString>(choice.column);
-    return withNames(Xlate("there is no column \"%1\"").arg(name), name, namesOf(columns));
+    return withExpected(Xlate("there is no column \"%1\"").arg(name), name, namesOf(columns));
 }
 
 QString twice(std::size_t first, std::size_t second, const QString &name)
@@ -97,8 +83,8 @@ std::optional<ColumnFault> ColumnBinding::bindChoices(std::vector<SourceColumn> 
         const auto parser = variables.find(choice.variable);
         if (!parser) {
             return ColumnFault{std::nullopt, choice.variable,
-                               withNames(Xlate("the dictionary has no variable \"%1\"").arg(choice.variable),
-                                         choice.variable, variables.names)};
+                               withExpected(Xlate("the dictionary has no variable \"%1\"").arg(choice.variable),
+                                            choice.variable, variables.names)};
         }
         if (chosen.contains(foldedKey(choice.variable))) {
             return ColumnFault{

@@ -31,16 +31,19 @@ bool parseOutOfRange(std::string_view text, double &number)
     return result.ec == std::errc() && std::isfinite(number);
 }
 
-/// Takes the digits at a position, with groups of three after a mark where there are such. @return whether they are groups
-bool takeDigits(std::string_view text, std::string_view mark, std::size_t &at, std::string &result)
+/// Takes the digits at a position, with groups of three after a mark of thousands where there are such. @return whether they are groups
+bool takeDigits(std::string_view text, const NumberStyle &style, bool isFraction, std::size_t &at, std::string &result)
 {
+    const std::string_view mark = isFraction ? std::string_view() : style.thousands;
     const std::size_t start = at;
     for (; at < text.size() && isDigit(text[at]); ++at) {
         result += text[at];
     }
     const bool mayHaveGroups = !mark.empty() && at - start <= 3;
-    while (mayHaveGroups && text.substr(at).starts_with(mark) && at + mark.size() < text.size() &&
-           isDigit(text[at + mark.size()]))
+    std::size_t groups = 0;
+    for (; mayHaveGroups && text.substr(at).starts_with(mark) && at + mark.size() < text.size() &&
+           isDigit(text[at + mark.size()]);
+         ++groups)
     {
         const std::string_view group = text.substr(at + mark.size());
         const std::size_t digits = std::min(group.find_first_not_of("0123456789"), group.size());
@@ -50,7 +53,9 @@ bool takeDigits(std::string_view text, std::string_view mark, std::size_t &at, s
         result += group.substr(0, digits);
         at += mark.size() + digits;
     }
-    return true;
+    // 0.123 is no number in thousands, but one with another decimal sign.
+    const bool isEnded = at == text.size() || text[at] != style.decimal;
+    return groups != 1 || text[start] != '0' || !isEnded || (mark != "." && mark != ",");
 }
 
 } // namespace
@@ -126,7 +131,7 @@ bool toPlainNumbers(std::string_view text, const NumberStyle &style, std::string
     bool isFraction = false;
     for (std::size_t at = 0; at < text.size();) {
         if (isDigit(text[at])) {
-            if (!takeDigits(text, isFraction ? std::string_view() : style.thousands, at, result)) {
+            if (!takeDigits(text, style, isFraction, at, result)) {
                 return false;
             }
             continue;

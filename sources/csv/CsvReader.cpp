@@ -62,10 +62,7 @@ bool CsvReader::next()
     if (error_) {
         return false;
     }
-    if (passesLines_) {
-        passOverLines();
-    }
-    if (skipEmptyEnd()) {
+    if ((passesLines_ && !passOverLines()) || skipEmptyEnd()) {
         return false;
     }
     rowStart_ = position_;
@@ -188,7 +185,7 @@ bool CsvReader::endRow(std::size_t end)
     position_ = end;
     if (end < bytes_.size() && bytes_[end] == '\r') {
         if (end + 1 < bytes_.size() && bytes_[end + 1] != '\n') {
-            return fail(end, Xlate("a carriage return without a line feed was not expected"));
+            return failBareReturn(end);
         }
         ++position_;
     }
@@ -197,6 +194,11 @@ bool CsvReader::endRow(std::size_t end)
     }
     ++line_;
     return true;
+}
+
+bool CsvReader::failBareReturn(std::size_t at)
+{
+    return fail(at, Xlate("a carriage return without a line feed was not expected"));
 }
 
 bool CsvReader::failTooLong()

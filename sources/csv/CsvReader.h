@@ -70,9 +70,9 @@ private:
     };
 
     void skipLines();
-    void passOverLines();
+    bool passOverLines();
     bool isPassedOver() const;
-    void passOverLine();
+    bool passOverLine();
     bool scanRow();
     bool scanSpacedRow();
     bool failInCell(std::size_t at);
@@ -81,6 +81,7 @@ private:
     void takeCells();
     bool skipEmptyEnd();
     bool failTooLong();
+    bool failBareReturn(std::size_t at);
     bool fail(std::size_t at, const QString &text);
     TextPlace placeOf(std::size_t at) const;
 

@@ -9,17 +9,19 @@ namespace kareport
 
 void CsvReader::skipLines()
 {
-    for (qsizetype i = 0; i < layout_.skip && position_ < bytes_.size(); ++i) {
-        passOverLine();
+    for (qsizetype i = 0; i < layout_.skip && position_ < bytes_.size() && passOverLine(); ++i) {
     }
 }
 
-/// Passes over lines that are no rows.
-void CsvReader::passOverLines()
+/// Passes over lines that are no rows. @return false when something is wrong with one
+bool CsvReader::passOverLines()
 {
     while (position_ < bytes_.size() && isPassedOver()) {
-        passOverLine();
+        if (!passOverLine()) {
+            return false;
+        }
     }
+    return true;
 }
 
 bool CsvReader::isPassedOver() const
@@ -31,11 +33,22 @@ bool CsvReader::isPassedOver() const
     return layout_.passesBlankLines && (text == std::string_view::npos || bytes_[text] == '\n');
 }
 
-void CsvReader::passOverLine()
+/// Passes over a line, whatever it holds. Where lines end with a carriage return alone, it would be all that follows: that is
+/// an error as in a row. @return false then
+bool CsvReader::passOverLine()
 {
     const std::size_t end = bytes_.find('\n', position_);
+    const std::string_view line =
+        bytes_.substr(position_, end - position_); // to the end where there is no such character
+    const std::size_t carriageReturn = line.find('\r');
+    if (carriageReturn != std::string_view::npos && carriageReturn + 1 < line.size()) {
+        rowStart_ = position_;
+        rowLine_ = line_;
+        return failBareReturn(position_ + carriageReturn);
+    }
     position_ = end == std::string_view::npos ? bytes_.size() : end + 1;
     ++line_;
+    return true;
 }
 
 /// Blank lines at the end of the file are no rows.

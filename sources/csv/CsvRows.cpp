@@ -1,5 +1,7 @@
 #include "CsvRows.h"
 
+#include "NearestName.h"
+#include "TextFolding.h"
 #include "Xlate.h"
 
 #include <algorithm>
@@ -10,14 +12,14 @@ namespace kareport
 namespace
 {
 
-constexpr std::size_t longestQuote = 40;
+constexpr qsizetype longestQuote = 40;
 
 /// A cell for a message, cut short.
 QString quoteOf(std::string_view cell)
 {
-    const QString text =
-        QString::fromUtf8(cell.data(), static_cast<qsizetype>(std::min(cell.size(), 4 * longestQuote)));
-    return text.size() > qsizetype(longestQuote) ? text.left(longestQuote) + u'…' : text;
+    constexpr std::size_t longestBytes = 4 * std::size_t(longestQuote) + 4; // what is cut off is not shown
+    const auto bytes = static_cast<qsizetype>(std::min(cell.size(), longestBytes));
+    return shortened(QString::fromUtf8(cell.data(), bytes), longestQuote);
 }
 
 /// Blanks of any kind, and marks that cannot be seen: programs leave them around the names of columns.
@@ -140,7 +142,9 @@ bool CsvRows::bindColumns(const CsvDialect &dialect, const Variables &variables)
     return true;
 }
 
-/// Whether the row that was read last has values of the variables instead of their names. A row of texts alone may be either.
+/// Whether the row that was read last has values of the variables instead of their names: half of those cells at least that
+/// are not of texts. A name may look like a number, and a row of data may have a cell that is wrong, or too few of them. A row
+/// of texts alone may be either.
 bool CsvRows::holdsValues(const CsvDialect &dialect) const
 {
     const auto &cells = reader_.cells();
@@ -148,22 +152,19 @@ bool CsvRows::holdsValues(const CsvDialect &dialect) const
     const auto chosenByNumber =
         std::count_if(dialect.columns.begin(), dialect.columns.end(),
                       [](const ColumnChoice &choice) { return std::holds_alternative<int>(choice.column); });
-    if (cells.size() != width_ || (isNamed_ && chosenByNumber != std::ssize(binding_.fields()))) {
+    if (isNamed_ && chosenByNumber != std::ssize(binding_.fields())) {
         return false;
     }
     UDataObject object;
-    bool hasNumber = false;
+    std::size_t values = 0;
+    std::size_t others = 0;
     for (const BoundField &field : binding_.fields()) {
-        const std::string_view cell = cells[field.column];
-        if (field.parser.isNone(cell)) {
-            continue;
+        const std::string_view cell = field.column < cells.size() ? cells[field.column] : std::string_view();
+        if (!field.parser.takesAnyText() && !field.parser.isNone(cell)) {
+            ++(field.parser.storeValue(cell, object) ? values : others);
         }
-        if (!field.parser.storeValue(cell, object)) {
-            return false;
-        }
-        hasNumber = hasNumber || !field.parser.takesAnyText();
     }
-    return hasNumber;
+    return values > 0 && values >= others;
 }
 
 void CsvRows::checkHeader()
@@ -189,6 +190,17 @@ void CsvRows::seek(const RowPlace &place)
     reader_.seek(place.start, place.line);
     error_.reset();
     released_ = file_->view().size(); // rows in another order come back to what was read
+}
+
+std::optional<TextPlace> CsvRows::placeOfNext(const QString &variable)
+{
+    if (!reader_.next()) {
+        return std::nullopt;
+    }
+    const auto &fields = binding_.fields();
+    const auto field = std::find_if(fields.begin(), fields.end(),
+                                    [&](const BoundField &other) { return equalFolded(other.variable, variable); });
+    return field != fields.end() ? reader_.placeOfCell(field->column) : TextPlace{reader_.rowLine(), 1};
 }
 
 void CsvRows::rewind()

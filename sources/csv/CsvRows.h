@@ -27,6 +27,7 @@ public:
     bool canSeek() const override { return true; }
     RowPlace place() const override { return {reader_.rowStart(), reader_.rowLine()}; }
     void seek(const RowPlace &place) override;
+    std::optional<TextPlace> placeOfNext(const QString &variable) override;
 
 private:
     bool readColumns(const CsvDialect &dialect);

@@ -161,7 +161,20 @@ TEST(CsvDialect, AnOrderNamesTheColumns)
             {"error 1:1 the header row holds values that fit the columns"},
             "the first point would be lost"},
            {withHeader, ",2\n2,3\n", {"error 1:1 the header row holds values"}, "also where it lacks a text"},
-           {withHeader, "1,\n2,3\n", {"number=2 northing=3"}, "a row without a number may be one of names"}});
+           {withHeader, "1,\n2,3\n", {"number=2 northing=3"}, "a row without a number may be one of names"},
+           {withHeader, "1,2,x\n2,3\n", {"error 1:1 the header row holds values"}, "with a cell too many"}});
+    CsvDialect points = ordered("PNEZD");
+    points.hasHeader = true;
+    const char *lost = "error 1:1 the header row holds values";
+    const char *point = "number=2 northing=3 easting=4 elevation=5 description=oak";
+    check({{points, "1,2,3,4\n2,3,4,5,oak\n", {lost}, "a first point without its last cell"},
+           {points, "1,2,3,4,elm,x\n2,3,4,5,oak\n", {lost}, "with one more"},
+           {points, "1,2,x,4,elm\n2,3,4,5,oak\n", {lost}, "with one that is wrong"},
+           {points, "1,2\n2,3,4,5,oak\n", {lost}, "with two cells"},
+           {points, "1\n2,3,4,5,oak\n", {point}, "a text alone is no point"},
+           {points, "Pt,North,East,2020,Code\n2,3,4,5,oak\n", {point}, "a name may be a number"},
+           {points, "Made today\n2,3,4,5,oak\n", {point}, "a title"},
+           {points, "Pt,N,E,Z\n2,3,4,5,oak\n", {point}, "names, too few of them"}});
     CsvDialect texts = ordered("PD");
     texts.hasHeader = true;
     CsvDialect list;
@@ -187,6 +200,11 @@ TEST(CsvDialect, ColumnsAreChosen)
         {chosen({{"Elevation", QStringLiteral("Z")}}), "Number,Y,Z\n1,2,3\n", point, "by its name"},
         {chosen({{"elevation", QStringLiteral("z")}}), "Number,Y,Z\n1,2,3\n", point, "in any case"},
         {chosen({{"Elevation", 3}}), "Number,Y,Z\n1,2,3\n", point, "by its number"},
+        {chosen({{"Elevation", 2020}}), "Number,2019,2020\n1,2,3\n", point, "a year is the name of a column"},
+        {chosen({{"Elevation", 2021}}),
+         "Number,2019,2020\n1,2,3\n",
+         {"error there is no column 2021: one of 1 to 3 was expected"},
+         "a year that is none"},
         {chosen({{"Elevation", QStringLiteral("Z")}}), "Number,Elevation,Z\n1,2,3\n", point,
          "the choice wins over the name"},
         {chosen({{"Elevation", QStringLiteral("Northing")}}), "Number,Y,Northing\n1,2,3\n", point,
@@ -256,6 +274,17 @@ TEST(CsvDialect, NumbersHaveTheirMarks)
          "points between thousands"},
         {numbered(';', ',', "."), "Northing\n1234567,25\n", {"northing=1234567.25"}, "thousands are not needed"},
         {numbered(';', ',', "."), "Northing\n1.23\n", {"error 2:1 the cell \"1.23\""}, "no group of three"},
+        {numbered(';', ',', "."),
+         "Northing\n0.123\n",
+         {"error 2:1 the cell \"0.123\""},
+         "a decimal point is no thousands"},
+        {numbered(';', '.', ","), "Northing\n-0,123\n", {"error 2:1 the cell"}, "nor is a decimal comma"},
+        {numbered(';', '.', ","),
+         "Northing\n0,123.5\n0,123,456\n",
+         {"northing=123.5", "northing=123456"},
+         "more of it is"},
+        {numbered(';', '.', "'"), "Northing\n0'123.5\n", {"northing=123.5"}, "an apostrophe is no decimal sign"},
+        {numbered(';', ',', "."), "Northing\n0,5\n10.123,5\n", {"northing=0.5", "northing=10123.5"}, "zeros elsewhere"},
         {numbered(';', ',', "."), "Northing\n1.2345\n", {"error 2:1 the cell"}, "a group of four"},
         {numbered(';', ',', "."), "Northing\n1234.567\n", {"error 2:1 the cell"}, "a first group of four"},
         {numbered(';', ',', "."), "Northing\n.567\n", {"error 2:1 the cell"}, "no first group"},
@@ -319,6 +348,17 @@ TEST(CsvDialect, LinesAreSkipped)
          "# nothing else",
          {"error 1:1 a header row of variable names was expected"},
          "comments alone"},
+    });
+    const char *bare = "a carriage return without a line feed was not expected";
+    const QString inFirst = QStringLiteral("error 1:8 ") + QLatin1StringView(bare);
+    check({
+        {passing(1, {}, false), "Job 7 x\rNumber,Count\r1,2\r", {inFirst}, "lines that end with a carriage return"},
+        {passing(0, '#', false), "# today\rNumber,Count\r1,2\r", {inFirst}, "a comment would be all of the file"},
+        {passing(0, '#', false),
+         "Number,Count\n1,2\n# end\r2,3\r",
+         {"number=1 count=2", QStringLiteral("error 3:6 ") + QLatin1StringView(bare)},
+         "the last comment as well"},
+        {passing(1, '#', false), "x\r\n# y\r\nNumber,Count\r\n1,2\r\n# z\r", {"number=1 count=2"}, "with a line feed"},
     });
     CsvDialect dialect = spaced();
     dialect.passesBlankLines = true;
