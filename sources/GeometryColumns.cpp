@@ -2,6 +2,7 @@
 
 #include "Xlate.h"
 
+#include <algorithm>
 #include <cmath>
 
 namespace kareport
@@ -28,6 +29,42 @@ void offerGeometryParts(std::vector<SourceColumn> &columns)
     for (const auto &part : geometryParts) {
         columns.push_back({QString::fromUtf16(part.second), std::nullopt, false, true});
     }
+}
+
+std::optional<ColumnFault> bindDatabaseColumns(ColumnBinding &binding, std::vector<SourceColumn> &columns,
+                                               const std::vector<ColumnChoice> &choices, const Variables &variables,
+                                               std::size_t ownColumns, std::vector<FieldSource> &sources)
+{
+    if (auto fault = binding.bind(columns, choices, variables)) {
+        return fault;
+    }
+    if (binding.fields().empty()) {
+        return ColumnFault{std::nullopt, QString(),
+                           Xlate("no column is a variable of the dictionary: there are %1")
+                               .arg(namesOf(columns).join(QStringLiteral(", ")))};
+    }
+    for (const BoundField &field : binding.fields()) {
+        FieldSource &source = sources.emplace_back();
+        if (field.column < ownColumns) {
+            source.column = static_cast<int>(field.column);
+        } else {
+            source.part = geometryParts[field.column - ownColumns].first;
+        }
+    }
+    return std::nullopt;
+}
+
+bool needsGeometry(const std::vector<FieldSource> &sources)
+{
+    return std::any_of(sources.begin(), sources.end(),
+                       [](const FieldSource &source) { return source.part.has_value(); });
+}
+
+bool needsReferenceSystem(const std::vector<FieldSource> &sources)
+{
+    return std::any_of(sources.begin(), sources.end(), [](const FieldSource &source) {
+        return source.part == GeometryPart::System || source.part == GeometryPart::SystemName;
+    });
 }
 
 std::optional<QString> storeGeometryPart(const ColumnBinding &binding, const BoundField &field, GeometryPart part,

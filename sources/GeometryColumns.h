@@ -42,6 +42,24 @@ struct ReferenceSystem
 /// Adds the columns that stand for parts of a geometry after those of the data itself.
 void offerGeometryParts(std::vector<SourceColumn> &columns);
 
+/// Where the value of a field comes from.
+struct FieldSource
+{
+    int column = -1;                  ///< of the data itself; below 0 for a part of a geometry
+    std::optional<GeometryPart> part; ///< of the geometry of the row
+};
+
+/// Binds the columns of a database, where none of them is a variable that is an error too.
+/// @param ownColumns  how many columns the data itself has; those of a geometry follow
+/// @param sources     receive where the values of the binding's fields come from, in their order
+/// @return what is wrong
+std::optional<ColumnFault> bindDatabaseColumns(ColumnBinding &binding, std::vector<SourceColumn> &columns,
+                                               const std::vector<ColumnChoice> &choices, const Variables &variables,
+                                               std::size_t ownColumns, std::vector<FieldSource> &sources);
+/// Whether a part of a geometry is read, or one that its reference system gives.
+bool needsGeometry(const std::vector<FieldSource> &sources);
+bool needsReferenceSystem(const std::vector<FieldSource> &sources);
+
 /// Stores a part of a point; what the point does not have is no value.
 /// @param point   nothing where there is no geometry
 /// @param system  null where it is not known

@@ -44,6 +44,7 @@ LibPq load()
     finder.find(pq.cancel, "PQcancel");
     finder.find(pq.errorMessage, "PQerrorMessage");
     finder.find(pq.finish, "PQfinish");
+    finder.find(pq.flush, "PQflush");
     finder.find(pq.fname, "PQfname");
     finder.find(pq.freeCancel, "PQfreeCancel");
     finder.find(pq.freemem, "PQfreemem");
@@ -66,6 +67,7 @@ LibPq load()
     finder.find(pq.sendQueryPrepared, "PQsendQueryPrepared");
     finder.find(pq.setErrorVerbosity, "PQsetErrorVerbosity");
     finder.find(pq.setNoticeProcessor, "PQsetNoticeProcessor");
+    finder.find(pq.setnonblocking, "PQsetnonblocking");
     finder.find(pq.setSingleRowMode, "PQsetSingleRowMode");
     finder.find(pq.socket, "PQsocket");
     finder.find(pq.status, "PQstatus");

@@ -20,6 +20,7 @@ struct LibPq
     decltype(&::PQcancel) cancel = nullptr;
     decltype(&::PQerrorMessage) errorMessage = nullptr;
     decltype(&::PQfinish) finish = nullptr;
+    decltype(&::PQflush) flush = nullptr;
     decltype(&::PQfname) fname = nullptr;
     decltype(&::PQfreeCancel) freeCancel = nullptr;
     decltype(&::PQfreemem) freemem = nullptr;
@@ -42,6 +43,7 @@ struct LibPq
     decltype(&::PQsendQueryPrepared) sendQueryPrepared = nullptr;
     decltype(&::PQsetErrorVerbosity) setErrorVerbosity = nullptr;
     decltype(&::PQsetNoticeProcessor) setNoticeProcessor = nullptr;
+    decltype(&::PQsetnonblocking) setnonblocking = nullptr;
     decltype(&::PQsetSingleRowMode) setSingleRowMode = nullptr;
     decltype(&::PQsocket) socket = nullptr;
     decltype(&::PQstatus) status = nullptr;

@@ -84,41 +84,36 @@ std::optional<int> PostgresRows::geometryColumnOf(const PGresult *description, c
 
 bool PostgresRows::bindColumns(const PostgresQuery &query, const Variables &variables)
 {
-    if (const auto fault = binding_.bind(columns_, query.columns, variables)) {
-        if (!fault->choice.isEmpty()) {
-            wrongChoice_ = fault;
-        }
+    const auto fault = bindDatabaseColumns(binding_, columns_, query.columns, variables, ownColumns_, sources_);
+    if (fault) {
+        wrongChoice_ = fault->choice.isEmpty() ? std::nullopt : fault;
         return fail(fault->text);
     }
-    if (binding_.fields().empty()) {
-        return fail(Xlate("no column is a variable of the dictionary: there are %1")
-                        .arg(namesOf(columns_).join(QStringLiteral(", "))));
-    }
-    for (const BoundField &field : binding_.fields()) {
-        Source &source = sources_.emplace_back();
-        if (field.column < ownColumns_) {
-            source.column = static_cast<int>(field.column);
-        } else {
-            source.part = geometryParts[field.column - ownColumns_].first;
-            needsGeometry_ = true;
-        }
-    }
+    needsGeometry_ = needsGeometry(sources_);
     return true;
 }
 
 /// Reads the reference systems, which the database describes where PostGIS is installed.
 void PostgresRows::readSystems()
 {
-    const PostgresResult table = connection_->read("SELECT to_regclass('spatial_ref_sys') IS NOT NULL");
+    // PostGIS may be in a schema that names are not looked up in, and another table may have the name there: that of the type of
+    // geometries comes first.
+    const PostgresResult table = connection_->read(
+        "SELECT c.oid::pg_catalog.regclass FROM pg_catalog.pg_class c WHERE c.relname = 'spatial_ref_sys' "
+        "AND c.relkind IN ('r', 'v', 'm', 'p', 'f') AND pg_catalog.has_schema_privilege(c.relnamespace, 'USAGE') "
+        "ORDER BY c.relnamespace IN (SELECT t.typnamespace FROM pg_catalog.pg_type t WHERE t.typname = 'geometry') DESC, "
+        "pg_catalog.pg_table_is_visible(c.oid) DESC, c.oid LIMIT 1");
     if (!table) {
         failUnlessStopped();
         return;
     }
-    if (pq_.getvalue(table.get(), 0, 0)[0] != 't') {
+    if (pq_.ntuples(table.get()) == 0) {
         return;
     }
-    const PostgresResult rows = connection_->read("SELECT srid, auth_name || ':' || auth_srid, "
-                                                  "substring(srtext from '\"([^\"]*)\"') FROM spatial_ref_sys");
+    const QByteArray name = pq_.getvalue(table.get(), 0, 0); // as SQL has it, with quotes where they are needed
+    const QByteArray sql =
+        "SELECT srid, auth_name || ':' || auth_srid, substring(srtext from '\"([^\"]*)\"') FROM " + name;
+    const PostgresResult rows = connection_->read(sql.constData());
     if (!rows) {
         failUnlessStopped();
         return;

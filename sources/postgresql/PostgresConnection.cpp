@@ -109,6 +109,10 @@ bool PostgresConnection::connect(const QByteArray &connection)
                            : Xlate("the server cannot be connected to: %1").arg(lineOf(pq_.errorMessage(connection_)))};
         return false;
     }
+    if (pq_.setnonblocking(connection_, 1) != 0) { // a long query must not be waited for until a server takes it
+        error_ = failure();
+        return false;
+    }
     pq_.setErrorVerbosity(connection_, PQERRORS_TERSE);
     pq_.setNoticeProcessor(
         connection_, [](void *, const char *) {}, nullptr);
@@ -148,20 +152,63 @@ void PostgresConnection::cancel()
     isCancelled_ = true;
 }
 
+/// Waits until all that was asked is sent. @return false when the connection is lost, or when it is to stop
+bool PostgresConnection::flush()
+{
+    for (;;) {
+        const int state = pq_.flush(connection_);
+        if (state == 0) {
+            return true;
+        }
+        if (isToEnd()) {
+            return false;
+        }
+        // A server that has something to say first takes nothing until that is read.
+        if (state < 0 || !takeInput(true)) {
+            return failLost();
+        }
+    }
+}
+
+/// Looks whether it is to stop, and ends what is running then.
+bool PostgresConnection::isToEnd()
+{
+    if (!isStopped()) {
+        return false;
+    }
+    isStopped_ = true;
+    cancel();
+    return true;
+}
+
+/// Waits a moment for the server, and takes what it sends. @return false when the connection is lost
+bool PostgresConnection::takeInput(bool forWriting)
+{
+    waitForSocket(pq_.socket(connection_), forWriting, waitMilliseconds);
+    return pq_.consumeInput(connection_) != 0;
+}
+
+/// Keeps why the connection is lost. @return false
+bool PostgresConnection::failLost()
+{
+    reason_ = lineOf(pq_.errorMessage(connection_));
+    isRunning_ = false;
+    return false;
+}
+
 /// The next answer; null when there is no other, when the connection is lost, or when it is to stop.
 PostgresResult PostgresConnection::await()
 {
     reason_.clear();
+    if (!flush()) {
+        return noResult();
+    }
     while (pq_.isBusy(connection_) != 0) {
-        if (isStopped()) {
-            isStopped_ = true;
-            cancel();
+        if (isToEnd()) {
             return noResult();
         }
-        waitForSocket(pq_.socket(connection_), false, waitMilliseconds);
-        if (pq_.consumeInput(connection_) == 0) {
-            reason_ = lineOf(pq_.errorMessage(connection_));
-            isRunning_ = false;
+        if (!takeInput(false)) {
+            failLost();
             return noResult();
         }
     }

@@ -60,6 +60,10 @@ private:
     bool begin();
     void cancel();
     PostgresResult ask(const char *sql);
+    bool flush();
+    bool isToEnd();
+    bool takeInput(bool forWriting);
+    bool failLost();
     PostgresResult await();
     PostgresResult expect(PostgresResult result, ExecStatusType status);
 

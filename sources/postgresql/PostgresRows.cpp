@@ -1,5 +1,6 @@
 #include "PostgresRows.h"
 
+#include "NearestName.h"
 #include "NumberText.h"
 #include "Xlate.h"
 
@@ -27,9 +28,9 @@ std::string_view textOf(const PGresult *row, int column)
 
 QString quoteOf(std::string_view text)
 {
-    const QString shown =
-        QString::fromUtf8(text.data(), static_cast<qsizetype>(std::min<std::size_t>(text.size(), 160)));
-    return shown.size() > longestQuote ? shown.left(longestQuote) + u'…' : shown;
+    constexpr std::size_t longestBytes = 4 * std::size_t(longestQuote) + 4; // what is cut off is not shown
+    const auto bytes = static_cast<qsizetype>(std::min(text.size(), longestBytes));
+    return shortened(QString::fromUtf8(text.data(), bytes), longestQuote);
 }
 
 } // namespace
@@ -46,10 +47,7 @@ PostgresRows::PostgresRows(std::shared_ptr<PostgresConnection> connection, const
     if (error_ || connection_->isStopped() || !prepare(query) || !bindColumns(query, variables)) {
         return;
     }
-    const bool needsSystems = std::any_of(sources_.begin(), sources_.end(), [](const Source &source) {
-        return source.part == GeometryPart::System || source.part == GeometryPart::SystemName;
-    });
-    if (needsSystems) {
+    if (needsReferenceSystem(sources_)) {
         readSystems();
     }
 }
@@ -106,7 +104,7 @@ bool PostgresRows::storeRow(const PGresult *row, UDataObject &object)
     binding_.begin(object);
     const auto &fields = binding_.fields();
     for (std::size_t i = 0; i < fields.size(); ++i) {
-        const Source &source = sources_[i];
+        const FieldSource &source = sources_[i];
         if (!source.part) {
             if (!storeCell(fields[i], row, source.column, object)) {
                 return false;

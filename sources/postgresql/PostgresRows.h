@@ -36,13 +36,6 @@ private:
     /// The type of a column of bytes, which has this number in every database.
     static constexpr Oid bytesType = 17;
 
-    /// Where the value of a field comes from.
-    struct Source
-    {
-        int column = -1; ///< of the answer
-        std::optional<GeometryPart> part;
-    };
-
     bool prepare(const PostgresQuery &query);
     bool findColumns(const PGresult *description);
     std::optional<int> geometryColumnOf(const PGresult *description, const std::vector<Oid> &types);
@@ -61,7 +54,7 @@ private:
     std::size_t ownColumns_ = 0;        ///< columns of the data itself; those of a geometry follow
     std::optional<int> geometryColumn_; ///< of the answer
     bool needsGeometry_ = false;
-    std::vector<Source> sources_; ///< of the fields
+    std::vector<FieldSource> sources_; ///< of the fields, with columns of the answer
     QHash<qint32, ReferenceSystem> systems_;
     std::optional<PointGeometry> point_; ///< of the row
     bool isSent_ = false;

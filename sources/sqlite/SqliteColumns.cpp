@@ -19,16 +19,6 @@ QString quoted(const QString &name)
     return u'"' + QString(name).replace(u'"', QStringLiteral("\"\"")) + u'"';
 }
 
-QString withTables(const QString &table, const QStringList &tables)
-{
-    const QString sentence = Xlate("the database has no table \"%1\"").arg(table);
-    const QString question = didYouMean(table, tables);
-    return sentence + QStringLiteral(": ") +
-           (!question.isEmpty() ? question
-                                : Xlate("one of %1 was expected")
-                                      .arg(tables.isEmpty() ? Xlate("none") : tables.join(QStringLiteral(", "))));
-}
-
 } // namespace
 
 /// Prepares what all columns are known by.
@@ -38,7 +28,10 @@ bool SqliteRows::prepareAll(const SqliteQuery &query)
         const QStringList tables = file_->tables();
         const bool isThere = file_->prepare(QStringLiteral("SELECT * FROM ") + quoted(query.table)) != nullptr;
         if (!isThere && !tables.contains(query.table, Qt::CaseInsensitive)) {
-            error_ = InputError{query.file, std::nullopt, withTables(query.table, tables)};
+            const QString sentence = Xlate("the database has no table \"%1\"").arg(query.table);
+            error_ = InputError{query.file, std::nullopt,
+                                tables.isEmpty() ? sentence + QStringLiteral(": ") + oneOfExpected(query.table, tables)
+                                                 : withExpected(sentence, query.table, tables)};
             return false;
         }
     }
@@ -81,30 +74,14 @@ bool SqliteRows::findColumns(const SqliteQuery &query)
 
 bool SqliteRows::bindColumns(const SqliteQuery &query, const Variables &variables)
 {
-    if (const auto fault = binding_.bind(columns_, query.columns, variables)) {
-        if (!fault->choice.isEmpty()) {
-            wrongChoice_ = fault;
-        }
+    const auto fault = bindDatabaseColumns(binding_, columns_, query.columns, variables, ownColumns_, sources_);
+    if (fault) {
+        wrongChoice_ = fault->choice.isEmpty() ? std::nullopt : fault;
         error_ = InputError{query.file, std::nullopt, fault->text};
         return false;
     }
-    if (binding_.fields().empty()) {
-        error_ = InputError{query.file, std::nullopt,
-                            Xlate("no column is a variable of the dictionary: there are %1")
-                                .arg(namesOf(columns_).join(QStringLiteral(", ")))};
-        return false;
-    }
-    for (const BoundField &field : binding_.fields()) {
-        Source &source = sources_.emplace_back();
-        if (field.column < ownColumns_) {
-            source.column = static_cast<int>(field.column);
-        } else {
-            source.part = geometryParts[field.column - ownColumns_].first;
-            needsGeometry_ = true;
-            const bool isSystem = source.part == GeometryPart::System || source.part == GeometryPart::SystemName;
-            error_ = isSystem && !error_ ? geometry_.systemsError() : error_;
-        }
-    }
+    needsGeometry_ = needsGeometry(sources_);
+    error_ = needsReferenceSystem(sources_) ? geometry_.systemsError() : std::nullopt;
     return !error_;
 }
 
@@ -115,7 +92,7 @@ bool SqliteRows::prepareNeeded(const SqliteQuery &query)
         return true;
     }
     std::vector<int> needed;
-    for (const Source &source : sources_) {
+    for (const FieldSource &source : sources_) {
         needed.push_back(source.part ? *geometryColumn_ : source.column);
     }
     std::sort(needed.begin(), needed.end());
@@ -127,7 +104,7 @@ bool SqliteRows::prepareNeeded(const SqliteQuery &query)
     for (const int column : needed) {
         names.append(quoted(columns_[static_cast<std::size_t>(column)].name));
     }
-    for (Source &source : sources_) {
+    for (FieldSource &source : sources_) {
         source.column = source.part ? -1 : indexOf(source.column);
     }
     geometryColumn_ = needsGeometry_ ? std::optional(indexOf(*geometryColumn_)) : std::nullopt;

@@ -68,8 +68,20 @@ bool isBlankSql(sqlite3 *database, const char *text)
 
 QString textOfColumn(sqlite3_stmt *statement, int column)
 {
+    if (sqlite3_column_type(statement, column) == SQLITE_NULL) {
+        return {};
+    }
+    const std::string_view text = bytesOfText(statement, column);
+    return QString::fromUtf8(text.data(), static_cast<qsizetype>(text.size()));
+}
+
+std::string_view bytesOfText(sqlite3_stmt *statement, int column)
+{
     const auto *text = reinterpret_cast<const char *>(sqlite3_column_text(statement, column));
-    return QString::fromUtf8(text, sqlite3_column_bytes(statement, column));
+    if (text == nullptr) {
+        throw std::bad_alloc(); // there is a text, which could not be had
+    }
+    return {text, static_cast<std::size_t>(sqlite3_column_bytes(statement, column))};
 }
 
 SqliteFile::SqliteFile(const QString &path) : path_(path)
@@ -79,18 +91,20 @@ SqliteFile::SqliteFile(const QString &path) : path_(path)
         error_ = InputError{path_, std::nullopt, Xlate("a database was expected, which is a file")};
         return;
     }
-    size_ = info.size();
-    modified_ = info.lastModified();
     // A complete path is never taken for an address with options in it.
     const QByteArray name = info.absoluteFilePath().toUtf8();
-    const int code =
-        sqlite3_open_v2(name.constData(), &database_, SQLITE_OPEN_READONLY | SQLITE_OPEN_FULLMUTEX, nullptr);
+    // One thread at a time uses it, so that no lock is needed for each value that is read.
+    const int code = sqlite3_open_v2(name.constData(), &database_, SQLITE_OPEN_READONLY | SQLITE_OPEN_NOMUTEX, nullptr);
     if (code != SQLITE_OK) {
         error_ = failure(code);
         return;
     }
     configure();
     if (begin()) {
+        // Not before: what a program has written that the lock was waited for is no change.
+        const QFileInfo locked(path);
+        size_ = locked.size();
+        modified_ = locked.lastModified();
         sqlite3_set_authorizer(database_, allowReading, this);
     }
 }

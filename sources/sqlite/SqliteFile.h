@@ -9,6 +9,7 @@
 #include <atomic>
 #include <memory>
 #include <optional>
+#include <string_view>
 
 #include <sqlite3.h>
 
@@ -19,7 +20,8 @@ namespace kareport
 using SqliteStatement = std::unique_ptr<sqlite3_stmt, int (*)(sqlite3_stmt *)>;
 
 /// A SQLite database that is read, in one state from the opening to the end. Its file is never written. What other programs
-/// have written and not yet moved into the file counts.
+/// have written and not yet moved into the file counts. One thread at a time may use it, which may change; only `stop` and
+/// `isStopped` are for all.
 class SqliteFile
 {
 public:
@@ -69,7 +71,10 @@ private:
     QDateTime modified_;
 };
 
-/// A text of a statement's column.
+/// A value of a statement's column as a text in UTF-8; valid until the next call for the column. It must not be NULL.
+/// @throws std::bad_alloc
+std::string_view bytesOfText(sqlite3_stmt *statement, int column);
+/// The same as a text; empty for NULL.
 QString textOfColumn(sqlite3_stmt *statement, int column);
 
 } // namespace kareport

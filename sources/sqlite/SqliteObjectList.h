@@ -30,7 +30,8 @@ struct SqliteQuery
 class SqliteObjectList : public RowObjectList
 {
 public:
-    /// Finds the columns. @param file  the database of the query, opened for reading. Lists of one file are of one state
+    /// Finds the columns. @param file  the database of the query, opened for reading. Lists of one file are of one state, and
+    ///              one of them exists at a time
     SqliteObjectList(std::shared_ptr<SqliteFile> file, const SqliteQuery &query, const Variables &variables,
                      ReadProgress progress);
     /// The same with a database that is opened for this list alone.

@@ -1,9 +1,11 @@
 #include "SqliteRows.h"
 
+#include "NearestName.h"
 #include "NumberText.h"
 #include "Xlate.h"
 
 #include <algorithm>
+#include <new>
 
 namespace kareport
 {
@@ -48,7 +50,7 @@ bool SqliteRows::next(UDataObject &object, const std::vector<unsigned> * /*onlyI
     binding_.begin(object);
     const auto &fields = binding_.fields();
     for (std::size_t i = 0; i < fields.size(); ++i) {
-        const Source &source = sources_[i];
+        const FieldSource &source = sources_[i];
         if (source.part ? !storePart(fields[i], *source.part, object) : !storeCell(fields[i], source.column, object)) {
             return false;
         }
@@ -73,10 +75,8 @@ bool SqliteRows::storeCell(const BoundField &field, int column, UDataObject &obj
 
 bool SqliteRows::storeText(const BoundField &field, int column, UDataObject &object)
 {
-    const auto *bytes = reinterpret_cast<const char *>(sqlite3_column_text(statement_.get(), column));
-    const auto size = static_cast<std::size_t>(sqlite3_column_bytes(statement_.get(), column));
-    const std::string_view text(bytes, bytes != nullptr ? size : 0);
-    rowBytes_ += size;
+    const std::string_view text = bytesOfText(statement_.get(), column);
+    rowBytes_ += text.size();
     if (field.parser.isNone(text)) {
         binding_.storeNone(field, object);
         return true;
@@ -101,6 +101,9 @@ bool SqliteRows::readGeometry()
     }
     const auto *bytes = static_cast<const char *>(sqlite3_column_blob(statement_.get(), column));
     const int size = sqlite3_column_bytes(statement_.get(), column);
+    if (bytes == nullptr && size > 0) {
+        throw std::bad_alloc();
+    }
     rowBytes_ += static_cast<std::size_t>(size);
     const PointOrFault read = parseGeoPackagePoint({bytes, bytes != nullptr ? static_cast<std::size_t>(size) : 0});
     if (const QString *instead = std::get_if<QString>(&read)) {
@@ -120,9 +123,8 @@ bool SqliteRows::failInCell(const BoundField &field, int column)
 {
     sqlite3_stmt *statement = statement_.get();
     const bool isBlob = sqlite3_column_type(statement, column) == SQLITE_BLOB;
-    QString shown =
-        isBlob ? Xlate("%1 bytes").arg(sqlite3_column_bytes(statement, column)) : textOfColumn(statement, column);
-    shown = shown.size() > longestQuote ? shown.left(longestQuote) + u'…' : shown;
+    const QString shown = isBlob ? Xlate("%1 bytes").arg(sqlite3_column_bytes(statement, column))
+                                 : shortened(textOfColumn(statement, column), longestQuote);
     return failInRow(Xlate("the value \"%1\" of the column \"%2\" does not fit: %3 was expected")
                          .arg(shown, field.name, field.parser.expected()));
 }

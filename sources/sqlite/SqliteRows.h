@@ -29,13 +29,6 @@ public:
     void stop() override { file_->stop(); }
 
 private:
-    /// Where the value of a field comes from.
-    struct Source
-    {
-        int column = -1; ///< of the statement
-        std::optional<GeometryPart> part;
-    };
-
     bool prepareAll(const SqliteQuery &query);
     bool findColumns(const SqliteQuery &query);
     bool bindColumns(const SqliteQuery &query, const Variables &variables);
@@ -52,7 +45,7 @@ private:
     SqliteStatement statement_{nullptr, sqlite3_finalize};
     std::size_t ownColumns_ = 0;        ///< columns of the data itself; those of a geometry follow
     std::optional<int> geometryColumn_; ///< of the statement
-    std::vector<Source> sources_;       ///< of the fields
+    std::vector<FieldSource> sources_;  ///< of the fields, with columns of the statement
     bool needsGeometry_ = false;
     std::optional<PointGeometry> point_; ///< of the row
     std::size_t row_ = 0;

@@ -313,6 +313,23 @@ TEST_F(PostgresServer, AQueryThatRunsLongCanBeStopped)
         << "the server does not go on";
 }
 
+TEST_F(PostgresServer, ReferenceSystemsAreThoseOfTheTypeOfGeometries)
+{
+    server().runSql("CREATE SCHEMA gis; CREATE SCHEMA other;"
+                    "CREATE TABLE other.spatial_ref_sys (srid int, auth_name text, auth_srid int, srtext text);"
+                    "INSERT INTO other.spatial_ref_sys VALUES (1, 'OTHER', 1, '');"
+                    "CREATE TABLE gis.spatial_ref_sys (srid int, auth_name text, auth_srid int, srtext text);"
+                    "INSERT INTO gis.spatial_ref_sys VALUES (1, 'EPSG', 31467, '');"
+                    "CREATE DOMAIN gis.geometry AS bytea;"
+                    "ALTER DATABASE survey SET search_path = other, public");
+    EXPECT_EQ(
+        rowsOf(query("SELECT '1' AS number, decode('010100002001000000000000000000F03F0000000000000040', 'hex') AS g",
+                     {}, {{"Description", QStringLiteral("@srs")}})),
+        "number=1 description=EPSG:31467")
+        << "not those of a table that only has the name";
+    server().runSql("ALTER DATABASE survey RESET search_path; DROP SCHEMA gis CASCADE; DROP SCHEMA other CASCADE");
+}
+
 TEST_F(PostgresServer, PointsHaveCoordinates)
 {
     // Points as PostGIS hands them out; the type itself, without PostGIS, by the functions of bytes.

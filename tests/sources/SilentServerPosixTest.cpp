@@ -11,6 +11,8 @@
 #include <gtest/gtest.h>
 
 #include <cstring>
+#include <future>
+#include <string>
 
 // A server that takes connections and never answers.
 
@@ -41,7 +43,43 @@ protected:
                 {}};
     }
 
+    /// Takes a connection, and answers its first questions as a server does until a query is prepared. From then on it reads
+    /// nothing. @return the connection
+    int serveUntilQuery() const
+    {
+        const int client = ::accept(socket_, nullptr, nullptr);
+        readMessage(client);
+        const std::string ready("Z\0\0\0\5I", 6);
+        send(client, std::string("R\0\0\0\x8\0\0\0\0", 9) + ready);
+        for (char kind = readByte(client); kind == 'Q'; kind = readByte(client)) {
+            readMessage(client);
+            send(client, std::string("C\0\0\0\x8SET\0", 9) + ready);
+        }
+        return client;
+    }
+
 private:
+    static void send(int client, const std::string &bytes)
+    {
+        EXPECT_EQ(::write(client, bytes.data(), bytes.size()), static_cast<ssize_t>(bytes.size()));
+    }
+    static char readByte(int client)
+    {
+        char byte = '\0';
+        return ::read(client, &byte, 1) == 1 ? byte : '\0';
+    }
+    /// A message without its kind: four bytes of its length with themselves, and what follows. It is thrown away.
+    static void readMessage(int client)
+    {
+        std::size_t length = 0;
+        for (int i = 0; i < 4; ++i) {
+            length = length << 8U | static_cast<unsigned char>(readByte(client));
+        }
+        for (std::size_t i = 4; i < length; ++i) {
+            readByte(client);
+        }
+    }
+
     QTemporaryDir folder_{QStringLiteral("/tmp/ka-silent-XXXXXX")};
     int socket_;
 };
@@ -63,6 +101,25 @@ TEST_F(SilentServer, IsSaidAfterTheTimeOfTheConnection)
     const PostgresObjectList list(query(" connect_timeout=1"), survey::variables(), {});
     ASSERT_TRUE(list.error());
     EXPECT_EQ(list.error()->text.toStdString(), "the server does not answer");
+}
+
+TEST_F(SilentServer, NeedNotTakeAQuery)
+{
+    std::future<int> served = std::async(std::launch::async, [this] { return serveUntilQuery(); });
+    kareport::PostgresQuery longQuery = query();
+    longQuery.query +=
+        QStringLiteral(" /*") + QString(32 << 20, u'x') + QStringLiteral("*/"); // more than a socket takes
+    QElapsedTimer timer;
+    timer.start();
+    {
+        PostgresObjectList list(longQuery, survey::variables(),
+                                [&timer](std::size_t) { return timer.elapsed() < 1000; });
+        EXPECT_EQ(list.GetAt(0), nullptr);
+        EXPECT_FALSE(list.error()) << list.error()->message().toStdString();
+    }
+    EXPECT_GE(timer.elapsed(), 1000) << "it has come to the query";
+    EXPECT_LT(timer.elapsed(), 8000);
+    ::close(served.get());
 }
 
 } // namespace

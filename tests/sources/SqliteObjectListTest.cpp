@@ -9,7 +9,9 @@
 
 #include <gtest/gtest.h>
 
+#include <chrono>
 #include <cmath>
+#include <thread>
 
 #include <sqlite3.h>
 
@@ -359,6 +361,39 @@ TEST(SqliteObjectList, ALockedDatabaseIsSaid)
     EXPECT_EQ(joined(rowsOf(database.table("points"))), "error the database is locked: another program writes to it");
     sqlite3_close(writer);
     EXPECT_EQ(rowsOf(database.table("points")).size(), 2) << "when it is let go";
+}
+
+TEST(SqliteObjectList, WhatAWriterPutInWhileItWasWaitedForIsNoChange)
+{
+    const Database database(points);
+    sqlite3 *writer = nullptr;
+    ASSERT_EQ(sqlite3_open(database.path().toUtf8().constData(), &writer), SQLITE_OK);
+    ASSERT_EQ(sqlite3_exec(writer,
+                           "BEGIN EXCLUSIVE; INSERT INTO points (Number, Code) VALUES ('new', zeroblob(100000))",
+                           nullptr, nullptr, nullptr),
+              SQLITE_OK);
+    std::thread ending([writer] {
+        std::this_thread::sleep_for(std::chrono::milliseconds(300)); // the lock is waited for meanwhile
+        EXPECT_EQ(sqlite3_exec(writer, "COMMIT", nullptr, nullptr, nullptr), SQLITE_OK);
+    });
+    const QStringList read = rowsOf(database.table("points"));
+    ending.join();
+    sqlite3_close(writer);
+    EXPECT_EQ(joined(read), "number=BM-1 northing=100.5 easting=200 count=3\nnumber=2 northing=-1000\nnumber=new");
+}
+
+TEST(SqliteObjectList, ATextThatMemoryEndsForIsNotAMissingOne)
+{
+    // Such a text is converted when it is asked for, which takes twice its length.
+    constexpr sqlite3_int64 megabyte = 1 << 20;
+    const Database database("PRAGMA encoding='UTF-16'; CREATE TABLE t (Number TEXT, Description TEXT);"
+                            "INSERT INTO t VALUES ('1', 'a'), ('2', hex(zeroblob(1048576)));");
+    SqliteObjectList list(database.table("t"), survey::variables(), {});
+    const sqlite3_int64 before = sqlite3_hard_heap_limit64(sqlite3_memory_used() + 6 * megabyte);
+    const QStringList read = survey::rowsOf(list);
+    sqlite3_hard_heap_limit64(before);
+    EXPECT_EQ(joined(read), "number=1 description=a\nerror there is not enough memory for the data");
+    EXPECT_EQ(survey::rowsOf(list).size(), 2) << "with memory they are read";
 }
 
 TEST(SqliteObjectList, AWriterThatWasKilledIsSaid)
