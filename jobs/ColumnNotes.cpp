@@ -1,5 +1,6 @@
 #include "ColumnNotes.h"
 
+#include "FieldFormatter.h"
 #include "FieldMarker.h"
 #include "NearestName.h"
 #include "TextFolding.h"
@@ -17,33 +18,8 @@ namespace
 constexpr std::size_t mostColumnNotes = 100;
 /// How many names a misspelt one is compared with.
 constexpr qsizetype mostNames = 1000;
-
-bool isUnread(const SourceColumn &column)
-{
-    return !column.isKnown && !column.isOffered && !column.name.isEmpty();
-}
-
-/// Names of columns that are not read and may have been meant for a variable.
-QStringList unreadNames(const SourceColumns &columns)
-{
-    QStringList names;
-    for (const SourceColumn &column : columns.columns) {
-        if (isUnread(column) && names.size() < mostNames) {
-            names.append(column.name);
-        }
-    }
-    return names;
-}
-
-/// The variable that is read under the identifier of another one.
-QString shownInstead(const SourceColumns &columns, const sXmlReportDictionary &dictionary, qint32 id)
-{
-    const auto found =
-        std::find_if(dictionary.Variables.begin(), dictionary.Variables.end(), [&](const sXmlReportVariable &other) {
-            return other.ID == id && isRead(columns, other.VariableName);
-        });
-    return found != dictionary.Variables.end() ? found->VariableName : QString();
-}
+/// More fields than this are not asked about: looking for the nearest name takes long.
+constexpr std::size_t mostQuestions = 100;
 
 } // namespace
 
@@ -65,18 +41,48 @@ QStringList variableNames(const sXmlReportDictionary &dictionary)
     return names;
 }
 
-bool isRead(const SourceColumns &columns, const QString &variable)
+ColumnComparison::ColumnComparison(const SourceColumns &columns, const sXmlReportDictionary &dictionary)
+    : columns_(columns), dictionary_(dictionary), read_(columns.variables.begin(), columns.variables.end())
 {
-    return columns.variables.contains(foldedKey(variable));
+    for (const sXmlReportVariable &variable : dictionary.Variables) {
+        const QString key = foldedKey(variable.VariableName);
+        variables_.insert(key, &variable);
+        if (read_.contains(key)) {
+            readById_.insert(variable.ID, &variable);
+        }
+    }
 }
 
-std::vector<JobNote> unknownColumns(const SourceColumns &columns, const sXmlReportDictionary &dictionary)
+bool ColumnComparison::isRead(const QString &variable) const
+{
+    return read_.contains(foldedKey(variable));
+}
+
+/// Whether a column is no variable. One whose variable is read from another column, as the job says, is one all the same.
+bool ColumnComparison::isUnknown(const SourceColumn &column) const
+{
+    return !column.isKnown && !column.isOffered && !column.name.isEmpty() &&
+           !variables_.contains(foldedKey(column.name));
+}
+
+/// The variable that shows in the place of another one: it is read, under the same identifier, and what it has is a number
+/// where a number is shown.
+QString ColumnComparison::shownInstead(const sXmlReportVariable &variable) const
+{
+    const auto [begin, end] = readById_.equal_range(variable.ID);
+    const auto found = std::find_if(begin, end, [&variable](const sXmlReportVariable *other) {
+        return (FieldFormatter::kindsOf(other->Type) & FieldFormatter::kindsOf(variable.Type)) != 0;
+    });
+    return found != end ? (*found)->VariableName : QString();
+}
+
+std::vector<JobNote> ColumnComparison::unknownColumns() const
 {
     std::vector<JobNote> notes;
-    const QStringList names = variableNames(dictionary);
+    const QStringList names = variableNames(dictionary_);
     std::size_t more = 0;
-    for (const SourceColumn &column : columns.columns) {
-        if (!isUnread(column)) {
+    for (const SourceColumn &column : columns_.columns) {
+        if (!isUnknown(column)) {
             continue;
         }
         if (notes.size() == mostColumnNotes) {
@@ -84,58 +90,58 @@ std::vector<JobNote> unknownColumns(const SourceColumns &columns, const sXmlRepo
             continue;
         }
         const QString sentence = Xlate("the column \"%1\" is not a variable of the dictionary \"%2\"")
-                                     .arg(column.name, dictionary.DictionaryName);
-        const QString question = didYouMean(column.name, names);
-        const QString text = question.isEmpty() ? sentence : sentence + QStringLiteral(": ") + question;
-        notes.push_back({JobNote::Kind::UnknownColumn, InputError{columns.source, column.place, text}});
+                                     .arg(column.name, dictionary_.DictionaryName);
+        notes.push_back({JobNote::Kind::UnknownColumn,
+                         InputError{columns_.source, column.place, withQuestion(sentence, column.name, names)}});
     }
     if (more > 0) {
         const QString text = Xlate("%1 more columns are not variables of the dictionary \"%2\"")
-                                 .arg(QString::number(more), dictionary.DictionaryName);
-        notes.push_back({JobNote::Kind::UnknownColumn, InputError{columns.source, std::nullopt, text}});
+                                 .arg(QString::number(more), dictionary_.DictionaryName);
+        notes.push_back({JobNote::Kind::UnknownColumn, InputError{columns_.source, std::nullopt, text}});
     }
     return notes;
 }
 
-QStringList assumedUnits(const SourceColumns &columns, const sXmlReportDictionary &dictionary, const DataUnits &units)
+QStringList ColumnComparison::assumedUnits(const DataUnits &units) const
 {
     QStringList keys;
-    for (const sXmlReportVariable &variable : dictionary.Variables) {
+    for (const sXmlReportVariable &variable : dictionary_.Variables) {
         const QString key = units.assumedKey(variable.Type);
-        if (!key.isEmpty() && !keys.contains(key) && isRead(columns, variable.VariableName)) {
+        if (!key.isEmpty() && !keys.contains(key) && isRead(variable.VariableName)) {
             keys.append(key);
         }
     }
     return keys;
 }
 
-std::vector<UnfilledField> unfilledFields(const SourceColumns &columns, const sXmlReportFields &fields,
-                                          const sXmlReportDictionary &dictionary)
+std::vector<UnfilledField> ColumnComparison::unfilledFields(const sXmlReportFields &fields) const
 {
     std::vector<UnfilledField> unfilled;
-    const QStringList unread = unreadNames(columns);
-    QStringList seen;
+    const QStringList names = variableNames(dictionary_);
+    QStringList unknown; // columns that may have been meant
+    for (const SourceColumn &column : columns_.columns) {
+        if (isUnknown(column) && unknown.size() < mostNames) {
+            unknown.append(column.name);
+        }
+    }
+    const auto questionOf = [&unfilled](const QString &name, const QStringList &known) {
+        return unfilled.size() < mostQuestions ? didYouMean(name, known) : QString();
+    };
+    QSet<QString> seen;
     for (const sXmlReportField &field : fields) {
-        // Of several variables with one name the last counts.
-        const auto variable = std::find_if(
-            dictionary.Variables.rbegin(), dictionary.Variables.rend(),
-            [&field](const sXmlReportVariable &other) { return equalFolded(other.VariableName, field.VariableName); });
+        const QString key = foldedKey(field.VariableName);
         // A marker, or a label without a variable, is filled by no column.
-        if (field.VariableName.isEmpty() || fieldMarker(field.VariableName) != FieldMarker::None ||
-            seen.contains(foldedKey(field.VariableName)))
+        if (field.VariableName.isEmpty() || fieldMarker(field.VariableName) != FieldMarker::None || seen.contains(key))
         {
             continue;
         }
-        seen.append(foldedKey(field.VariableName));
-        if (variable == dictionary.Variables.rend()) {
+        seen.insert(key);
+        const sXmlReportVariable *variable = variables_.value(key);
+        if (variable == nullptr) {
+            unfilled.push_back({field.VariableName, questionOf(field.VariableName, names), false, {}});
+        } else if (!read_.contains(key)) { // not the identifier counts: another variable may have the same one
             unfilled.push_back(
-                {field.VariableName, didYouMean(field.VariableName, variableNames(dictionary)), false, {}});
-            continue;
-        }
-        // Not the identifier counts: another variable may have the same one.
-        if (!isRead(columns, field.VariableName)) {
-            unfilled.push_back({field.VariableName, didYouMean(field.VariableName, unread), true,
-                                shownInstead(columns, dictionary, variable->ID)});
+                {field.VariableName, questionOf(field.VariableName, unknown), true, shownInstead(*variable)});
         }
     }
     return unfilled;

@@ -6,6 +6,8 @@
 #include "sXmlReportDictionary.h"
 #include "sXmlReportField.h"
 
+#include <QHash>
+#include <QSet>
 #include <QString>
 #include <QStringList>
 
@@ -39,17 +41,33 @@ struct UnfilledField
 /// The names of the variables of a dictionary, in its order.
 QStringList variableNames(const sXmlReportDictionary &dictionary);
 
-/// Whether a variable is read from a column.
-bool isRead(const SourceColumns &columns, const QString &variable);
+/// What the columns of a data set and a dictionary have in common. Both must live longer.
+class ColumnComparison
+{
+public:
+    ColumnComparison(const SourceColumns &columns, const sXmlReportDictionary &dictionary);
 
-/// Notes on the columns that are no variable of a dictionary. Of very many, the last note says how many more there are.
-std::vector<JobNote> unknownColumns(const SourceColumns &columns, const sXmlReportDictionary &dictionary);
+    /// Whether a variable is read from a column.
+    bool isRead(const QString &variable) const;
 
-/// The keys of the units that numbers of the data are taken to be in, as the job does not say them.
-QStringList assumedUnits(const SourceColumns &columns, const sXmlReportDictionary &dictionary, const DataUnits &units);
+    /// Notes on the columns that are no variable of the dictionary. Of very many, the last note says how many more there are.
+    std::vector<JobNote> unknownColumns() const;
 
-/// The fields of a table or block whose variable is read from no column, or is not in the dictionary, each variable once.
-std::vector<UnfilledField> unfilledFields(const SourceColumns &columns, const sXmlReportFields &fields,
-                                          const sXmlReportDictionary &dictionary);
+    /// The keys of the units that numbers of the data are taken to be in, as the job does not say them.
+    QStringList assumedUnits(const DataUnits &units) const;
+
+    /// The fields of a table or block whose variable is read from no column, or is not in the dictionary, each variable once.
+    std::vector<UnfilledField> unfilledFields(const sXmlReportFields &fields) const;
+
+private:
+    bool isUnknown(const SourceColumn &column) const;
+    QString shownInstead(const sXmlReportVariable &variable) const;
+
+    const SourceColumns &columns_;
+    const sXmlReportDictionary &dictionary_;
+    QSet<QString> read_;                                      ///< the folded names of the variables that are read
+    QHash<QString, const sXmlReportVariable *> variables_;    ///< by their folded names; of several the last one
+    QMultiHash<qint32, const sXmlReportVariable *> readById_; ///< those that are read
+};
 
 } // namespace kareport

@@ -1,18 +1,37 @@
 #include "DataFiles.h"
 
+#include "FileIdentity.h"
 #include "Xlate.h"
 
 namespace kareport
 {
 
+namespace
+{
+
+/// The same for all names of a file. What is no file has its name alone.
+QString keyOf(const QString &path)
+{
+    const QString identity = path == u"-" ? QString() : fileIdentity(path);
+    return identity.isEmpty() ? path : identity;
+}
+
+} // namespace
+
+std::shared_ptr<SqliteFile> &DataFiles::database(const QString &path)
+{
+    return databases_[keyOf(path)];
+}
+
 Expected<std::shared_ptr<const FileBytes>> DataFiles::open(const QString &path)
 {
-    if (const auto known = files_.constFind(path); known != files_.constEnd()) {
+    const QString key = keyOf(path);
+    if (const auto known = files_.constFind(key); known != files_.constEnd()) {
         return *known;
     }
     auto opened = path == u"-" ? FileBytes::openStandardInput() : FileBytes::open(path);
     if (errorOf(opened) == nullptr) {
-        files_.insert(path, std::get<std::shared_ptr<const FileBytes>>(opened));
+        files_.insert(key, std::get<std::shared_ptr<const FileBytes>>(opened));
     }
     return opened;
 }

@@ -22,13 +22,13 @@ public:
     Expected<std::shared_ptr<const FileBytes>> open(const QString &path);
 
     /// The SQLite database of a path; empty until it is opened.
-    std::shared_ptr<SqliteFile> &database(const QString &path) { return databases_[path]; }
+    std::shared_ptr<SqliteFile> &database(const QString &path);
     /// The connection to a PostgreSQL database; empty until it is made.
     std::shared_ptr<PostgresConnection> &connection(const QString &name) { return connections_[name]; }
 
 private:
-    QHash<QString, std::shared_ptr<const FileBytes>> files_; ///< by their paths
-    QHash<QString, std::shared_ptr<SqliteFile>> databases_;  ///< by their paths
+    QHash<QString, std::shared_ptr<const FileBytes>> files_; ///< by what files they are
+    QHash<QString, std::shared_ptr<SqliteFile>> databases_;  ///< by what files they are
     QHash<QString, std::shared_ptr<PostgresConnection>> connections_;
 };
 

@@ -22,12 +22,30 @@ QString keyOf(JobNote::Kind kind)
     case JobNote::Kind::BlankValue: return QStringLiteral("blank-value");
     case JobNote::Kind::NotFinite: return QStringLiteral("not-finite");
     case JobNote::Kind::UnknownSortKey: return QStringLiteral("unknown-sort-key");
+    case JobNote::Kind::UnshownCharacter: return QStringLiteral("unshown-character");
     case JobNote::Kind::Difference: return QStringLiteral("difference");
     case JobNote::Kind::PassedOver: return QStringLiteral("passed-over");
     case JobNote::Kind::AssumedUnit: return QStringLiteral("assumed-unit");
     case JobNote::Kind::UnfilledField: break;
     }
     return QStringLiteral("unfilled-field");
+}
+
+/// Which values a note is about.
+void insertValues(QJsonObject &object, const JobNote &note)
+{
+    object.insert(QStringLiteral("count"), static_cast<qint64>(note.values));
+    if (note.firstRow > 0) {
+        object.insert(QStringLiteral("row"), static_cast<qint64>(note.firstRow));
+    }
+    object.insert(QStringLiteral("reportLine"), note.line);
+    if (!note.dataFile.isEmpty()) {
+        object.insert(QStringLiteral("dataFile"), note.dataFile);
+    }
+    if (note.dataPlace) {
+        object.insert(QStringLiteral("dataLine"), note.dataPlace->line);
+        object.insert(QStringLiteral("dataColumn"), note.dataPlace->column);
+    }
 }
 
 } // namespace
@@ -65,9 +83,7 @@ QByteArray JobNotes::toJson() const
         }
         object.insert(QStringLiteral("text"), note.about.text);
         if (note.values > 0) {
-            object.insert(QStringLiteral("count"), static_cast<qint64>(note.values));
-            object.insert(QStringLiteral("row"), static_cast<qint64>(note.firstRow));
-            object.insert(QStringLiteral("reportLine"), note.line);
+            insertValues(object, note);
         }
         list.append(object);
     }

@@ -6,6 +6,7 @@
 #include <QHash> // std::hash<QString>
 #include <QString>
 
+#include <optional>
 #include <unordered_set>
 #include <vector>
 
@@ -25,15 +26,18 @@ struct JobNote
         BlankValue, ///< numbers that are not there and show as blanks, as the job asks for: for the file of notes alone
         NotFinite,  ///< values that are infinite or not-a-number
         UnknownSortKey, ///< a sort key of a table that is in no dictionary, so that the rows are sorted by another one
-        Difference,     ///< what does not fit together in the data itself
-        PassedOver,     ///< what a data file holds and no list reads: said, but no mistake of anybody
+        UnshownCharacter, ///< a character of the report that an output cannot show
+        Difference,       ///< what does not fit together in the data itself
+        PassedOver,       ///< what a data file holds and no list reads: said, but no mistake of anybody
         AssumedUnit ///< a unit of the data that the job does not say: for the file of notes alone, no reason to say anything
     };
     Kind kind;
-    InputError about;     ///< the place and the text
-    qint64 line = 0;      ///< of the report, from 1; 0 for none
-    quint64 values = 0;   ///< how many values are meant; 0 for none
-    quint64 firstRow = 0; ///< of the data as it is printed, from 1; 0 for none
+    InputError about;      ///< the place and the text
+    qint64 line = 0;       ///< of the report, from 1; 0 for none
+    quint64 values = 0;    ///< how many values are meant; 0 for none
+    quint64 firstRow = 0;  ///< of the data as it is printed, from 1; 0 for none
+    QString dataFile = {}; ///< what the value of that row was read from; empty where it is not known
+    std::optional<TextPlace> dataPlace = std::nullopt; ///< where it stands there; nothing for a database
 
     /// Whether the user has to look at it.
     bool isToBeSaid() const { return kind != Kind::AssumedUnit && kind != Kind::BlankValue; }
@@ -52,8 +56,8 @@ public:
     const std::vector<JobNote> &all() const { return notes_; }
     /// Those that are to be said.
     std::vector<JobNote> said() const;
-    /// A JSON list of the notes as objects with "kind", "file", "line", "column", "text", and for values "count", "row"
-    /// and "reportLine", in UTF-8.
+    /// A JSON list of the notes as objects with "kind", "file", "line", "column", "text", and for values "count", "row",
+    /// "reportLine", "dataFile", "dataLine" and "dataColumn", in UTF-8.
     QByteArray toJson() const;
 
 private:

@@ -16,7 +16,7 @@ namespace kareport
 namespace
 {
 
-QString withQuestion(const QString &sentence, const QString &question)
+QString joined(const QString &sentence, const QString &question)
 {
     return question.isEmpty() ? sentence : sentence + QStringLiteral(": ") + question;
 }
@@ -27,46 +27,99 @@ std::optional<InputError> firstOf(std::optional<InputError> first, std::optional
     return first ? first : second;
 }
 
+/// What is said of a value, and of several.
+struct ValueSentences
+{
+    QString one;
+    QString several;
+};
+
+ValueSentences wideSentences()
+{
+    return {Xlate("%1 value is wider than the field \"%2\" of the %3 \"%4\", in row %5, line %6 of the report"),
+            Xlate("%1 values are wider than the field \"%2\" of the %3 \"%4\", the first one in row %5, line %6 of the "
+                  "report")};
+}
+
+ValueSentences hashSentences()
+{
+    return {Xlate("%1 value is wider than the field \"%2\" of the %3 \"%4\" and shows as #, in row %5, line %6 of the "
+                  "report"),
+            Xlate("%1 values are wider than the field \"%2\" of the %3 \"%4\" and show as #, the first one in row %5, "
+                  "line %6 of the report")};
+}
+
+ValueSentences infiniteSentences()
+{
+    return {
+        Xlate("%1 value of the field \"%2\" of the %3 \"%4\" is infinite or not a number, in row %5, line %6 of the "
+              "report"),
+        Xlate("%1 values of the field \"%2\" of the %3 \"%4\" are infinite or not a number, the first one in row %5, "
+              "line %6 of the report")};
+}
+
+ValueSentences zeroSentences()
+{
+    return {Xlate("%1 value of the field \"%2\" of the %3 \"%4\" is missing and shows as 0, in row %5, line %6 of the "
+                  "report"),
+            Xlate("%1 values of the field \"%2\" of the %3 \"%4\" are missing and show as 0, the first one in row %5, "
+                  "line %6 of the report")};
+}
+
+ValueSentences blankSentences()
+{
+    return {
+        Xlate("%1 value of the field \"%2\" of the %3 \"%4\" is missing and shows as blanks, in row %5, line %6 of the "
+              "report"),
+        Xlate("%1 values of the field \"%2\" of the %3 \"%4\" are missing and show as blanks, the first one in row "
+              "%5, line %6 of the report")};
+}
+
 } // namespace
 
 /// Something about a variable that a table or block names, with its place in the template; the step has one anyway.
 InputError JobSteps::inTemplate(TemplatePart part, const QString &variable, const WrittenRecord &record,
-                                const QString &text) const
+                                const QString &text)
 {
-    if (job_.reportTemplate) {
-        const auto &[path, name] = *job_.reportTemplate;
-        const auto file = readTemplateSource(path);
-        const auto *content = std::get_if<TemplateFile>(&file);
-        const auto place =
-            content != nullptr ? placeOfVariable(*content, name, part, record.name, variable) : std::nullopt;
-        if (place) {
-            return {path, place, text};
+    if (job_.reportTemplate && !arePlacesRead_) {
+        arePlacesRead_ = true;
+        const auto file = readTemplateSource(job_.reportTemplate->file);
+        if (const auto *content = std::get_if<TemplateFile>(&file)) {
+            places_ = std::make_unique<VariablePlaces>(*content, job_.reportTemplate->name);
         }
     }
-    return source_.errorAt(record.path, text);
+    const auto place = places_ ? places_->of(part, record.name, variable) : std::nullopt;
+    return place ? InputError{job_.reportTemplate->file, place, text} : source_.errorAt(record.path, text);
 }
 
-/// Notes what of the data and of a table or block does not match, once the columns are known.
-JobSteps::Wrong JobSteps::noteColumns(const RowList &rows, const QString &data, const WrittenRecord &record)
+/// Notes what of the data and of a table or block does not match.
+JobSteps::Wrong JobSteps::noteColumns(const SourceColumns &columns, const QString &data, const WrittenRecord &record)
 {
-    const auto columns = rows.columns();
-    if (!columns) {
-        return std::nullopt;
-    }
-    const sXmlReportDictionary &dictionary = *report_.GetTemplate()->GetDictionary(record.use);
-    auto wrong = notes_.add(unknownColumns(*columns, dictionary));
-    for (const UnfilledField &field : unfilledFields(*columns, record.fields, dictionary)) {
+    const ColumnComparison compared(columns, *report_.GetTemplate()->GetDictionary(record.use));
+    auto wrong = notes_.add(compared.unknownColumns());
+    for (const UnfilledField &field : compared.unfilledFields(record.fields)) {
         wrong = firstOf(wrong, noteField(field, record));
     }
+    noteUnits(compared, data);
+    return wrong;
+}
+
+/// Notes the units that nobody says, once for a data set.
+void JobSteps::noteUnits(const ColumnComparison &compared, const QString &data)
+{
     const Job::DataSet &set = *job_.data.constFind(data);
-    if (!set.source->hasOwnUnits()) {
-        for (const QString &key : assumedUnits(*columns, dictionary, set.units)) {
+    if (set.source->hasOwnUnits()) {
+        return;
+    }
+    for (const QString &key : compared.assumedUnits(set.units)) {
+        const QString noted = key + u':' + data;
+        if (!notedUnits_.contains(noted)) {
+            notedUnits_.insert(noted); // finding the place reads the job from its beginning
             const QString text =
                 Xlate("the data \"%1\" does not say the unit of its numbers: %2 was taken").arg(data, key);
             notes_.add({{JobNote::Kind::AssumedUnit, source_.errorAt({QStringLiteral("data"), data}, text)}});
         }
     }
-    return wrong;
 }
 
 JobSteps::Wrong JobSteps::noteField(const UnfilledField &field, const WrittenRecord &record)
@@ -75,15 +128,15 @@ JobSteps::Wrong JobSteps::noteField(const UnfilledField &field, const WrittenRec
     if (!field.isVariable) {
         const QString sentence = Xlate("the field \"%1\" of the %2 \"%3\" is not a variable of the dictionary \"%4\"")
                                      .arg(field.variable, record.what, record.name, record.use);
-        return notes_.add({{Kind::UnfilledField,
-                            inTemplate(record.part, field.variable, record, withQuestion(sentence, field.question))}});
+        return notes_.add(
+            {{Kind::UnfilledField, inTemplate(record.part, field.variable, record, joined(sentence, field.question))}});
     }
     const QString sentence =
         Xlate("no column fills the field \"%1\" of the %2 \"%3\"").arg(field.variable, record.what, record.name);
     const QString reason = field.shown.isEmpty() ? sentence
                                                  : sentence + QStringLiteral("; ") +
                                                        Xlate("\"%1\" has the same ID and shows there").arg(field.shown);
-    return notes_.add({{Kind::UnfilledField, source_.errorAt(record.path, withQuestion(reason, field.question))}});
+    return notes_.add({{Kind::UnfilledField, source_.errorAt(record.path, joined(reason, field.question))}});
 }
 
 /// Notes sort keys that the dictionary does not have: the key before such a one counts in its place.
@@ -96,16 +149,18 @@ JobSteps::Wrong JobSteps::noteSortKeys(const WrittenRecord &record)
         return wrong;
     }
     const QStringList names = variableNames(*tpl.GetDictionary(record.use));
+    QSet<QString> known;
+    for (const QString &name : names) {
+        known.insert(foldedKey(name));
+    }
     for (const sXmlSortVariable &key : sort->Entries) {
-        const bool isKnown = std::any_of(names.begin(), names.end(),
-                                         [&key](const QString &name) { return equalFolded(name, key.VariableName); });
-        if (isKnown) {
+        if (known.contains(foldedKey(key.VariableName))) {
             continue;
         }
         const QString sentence =
             Xlate("the sort key \"%1\" of the table \"%2\" is not a variable of the dictionary \"%3\"")
                 .arg(key.VariableName, record.name, record.use);
-        const QString text = withQuestion(sentence, didYouMean(key.VariableName, names));
+        const QString text = withQuestion(sentence, key.VariableName, names);
         wrong = firstOf(wrong, notes_.add({{JobNote::Kind::UnknownSortKey,
                                             inTemplate(TemplatePart::SortKey, key.VariableName, record, text)}}));
     }
@@ -113,49 +168,43 @@ JobSteps::Wrong JobSteps::noteSortKeys(const WrittenRecord &record)
 }
 
 /// Notes which values of a table or block that was written do not show as they are.
-JobSteps::Wrong JobSteps::noteValues(const RowList &rows, const WrittenRecord &record)
+JobSteps::Wrong JobSteps::noteValues(RowList &rows, const std::optional<SourceColumns> &columns,
+                                     const WrittenRecord &record)
 {
+    const QStringList variables = columns ? columns->variables : QStringList();
+    const QSet<QString> read(variables.begin(), variables.end());
     Wrong wrong;
     for (const ColumnRemarks &column : notes_.remarks.columns) {
-        wrong = firstOf(wrong, noteValue(column, rows, record));
+        const bool isRead = !columns || read.contains(foldedKey(column.variable));
+        wrong = firstOf(wrong, noteValue(column, isRead, rows, record));
     }
     return wrong;
 }
 
-JobSteps::Wrong JobSteps::noteValue(const ColumnRemarks &column, const RowList &rows, const WrittenRecord &record)
+JobSteps::Wrong JobSteps::noteValue(const ColumnRemarks &column, bool isRead, RowList &rows,
+                                    const WrittenRecord &record)
 {
     using Kind = JobNote::Kind;
     Wrong wrong;
-    const auto note = [&](Kind kind, const QString &sentence, const ValueCount &values) {
+    const auto note = [&](Kind kind, const ValueCount &values, const ValueSentences &sentences) {
         if (values.count == 0) {
             return;
         }
-        const QString text = sentence.arg(QString::number(values.count), column.variable, record.what, record.name,
-                                          QString::number(values.firstRow), QString::number(values.firstLine));
-        wrong = firstOf(wrong, notes_.add({{kind, source_.errorAt(record.path, text), values.firstLine, values.count,
-                                            values.firstRow}}));
+        const QString text = (values.count == 1 ? sentences.one : sentences.several)
+                                 .arg(QString::number(values.count), column.variable, record.what, record.name,
+                                      QString::number(values.firstRow), QString::number(values.firstLine));
+        JobNote found = {kind, source_.errorAt(record.path, text), values.firstLine, values.count, values.firstRow};
+        const auto place = rows.placeOf(static_cast<std::size_t>(values.firstRow) - 1, column.variable);
+        found.dataFile = place.file;
+        found.dataPlace = place.place;
+        wrong = firstOf(wrong, notes_.add({found}));
     };
-    note(Kind::WideValue,
-         job_.options.printHash ? Xlate("%1 values are wider than the field \"%2\" of the %3 \"%4\" and show as #, the "
-                                        "first one in row %5, line %6 of the report")
-                                : Xlate("%1 values are wider than the field \"%2\" of the %3 \"%4\", the first one in "
-                                        "row %5, line %6 of the report"),
-         column.tooWide);
-    note(Kind::NotFinite,
-         Xlate("%1 values of the field \"%2\" of the %3 \"%4\" are infinite or not a number, the first one in row %5, "
-               "line %6 of the report"),
-         column.notFinite);
+    note(Kind::WideValue, column.tooWide, job_.options.printHash ? hashSentences() : wideSentences());
+    note(Kind::NotFinite, column.notFinite, infiniteSentences());
     // Of a field that no column fills there is a note already.
-    const auto columns = rows.columns();
-    if (!columns || isRead(*columns, column.variable)) {
-        note(Kind::MissingValue,
-             Xlate("%1 values of the field \"%2\" of the %3 \"%4\" are missing and show as 0, the first one in row %5, "
-                   "line %6 of the report"),
-             column.missing);
-        note(Kind::BlankValue,
-             Xlate("%1 values of the field \"%2\" of the %3 \"%4\" are missing and show as blanks, the first one in "
-                   "row %5, line %6 of the report"),
-             column.blank);
+    if (isRead) {
+        note(Kind::MissingValue, column.missing, zeroSentences());
+        note(Kind::BlankValue, column.blank, blankSentences());
     }
     return wrong;
 }

@@ -95,7 +95,8 @@ JobSteps::Wrong JobSteps::write(const Job::Block &step, const JsonPath &path)
         return error;
     }
     const WrittenRecord record = {Xlate("block"), TemplatePart::Block, step.name, block->Use, block->Fields, path};
-    if (auto wrong = noteColumns(rows, step.data, record)) {
+    const auto columns = rows.columns();
+    if (auto wrong = columns ? noteColumns(*columns, step.data, record) : std::nullopt) {
         return wrong;
     }
     if (auto wrong = noteSource(rows)) {
@@ -106,7 +107,7 @@ JobSteps::Wrong JobSteps::write(const Job::Block &step, const JsonPath &path)
     }
     needMemory(report_.WriteDataBlock(step.name, &first, step.before, step.after));
     addFit(false, step.name, block->Fields, step.data, path);
-    return noteValues(rows, record);
+    return noteValues(rows, columns, record);
 }
 
 JobSteps::Wrong JobSteps::write(const Job::Table &step, const JsonPath &path)
@@ -127,7 +128,8 @@ JobSteps::Wrong JobSteps::write(const Job::Table &step, const JsonPath &path)
     RowList &rows = *std::get<std::unique_ptr<RowList>>(opened);
     const WrittenRecord record = {Xlate("table"), TemplatePart::Table, step.name, table->Use, table->Fields, path};
     // Columns that are known already are looked at before hundreds of thousands of rows are.
-    if (auto wrong = noteColumns(rows, step.data, record)) {
+    auto columns = rows.columns();
+    if (auto wrong = columns ? noteColumns(*columns, step.data, record) : std::nullopt) {
         return wrong;
     }
     if (auto wrong = noteSortKeys(record)) {
@@ -138,14 +140,17 @@ JobSteps::Wrong JobSteps::write(const Job::Table &step, const JsonPath &path)
         return error;
     }
     addFit(true, step.name, table->Fields, step.data, path);
-    if (auto wrong = noteColumns(rows, step.data, record)) {
-        return wrong;
+    if (!columns) {
+        columns = rows.columns();
+        if (auto wrong = columns ? noteColumns(*columns, step.data, record) : std::nullopt) {
+            return wrong;
+        }
     }
     if (isStopped_()) {
         return std::nullopt;
     }
     auto wrong = noteSource(rows);
-    auto other = noteValues(rows, record);
+    auto other = noteValues(rows, columns, record);
     return wrong ? wrong : other;
 }
 

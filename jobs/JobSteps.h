@@ -10,6 +10,8 @@
 #include "TemplatePlaces.h"
 #include "UReportDoc.h"
 
+#include <QSet>
+
 #include <functional>
 #include <memory>
 #include <optional>
@@ -69,17 +71,17 @@ private:
     template <typename Record>
     Wrong wrongRecord(const Record &record, const QString &what, const QString &name, const JsonPath &path) const;
     Expected<std::unique_ptr<RowList>> openRows(const QString &data, const QString &dictionary, bool firstOnly);
-    Wrong noteColumns(const RowList &rows, const QString &data, const WrittenRecord &record);
+    Wrong noteColumns(const SourceColumns &columns, const QString &data, const WrittenRecord &record);
+    void noteUnits(const ColumnComparison &compared, const QString &data);
     Wrong noteField(const UnfilledField &field, const WrittenRecord &record);
     Wrong noteSortKeys(const WrittenRecord &record);
     Wrong noteSource(const RowList &rows);
     QString shownText(const QString &text) const;
     void addFit(bool isTable, const QString &name, const sXmlReportFields &fields, const QString &data,
                 const JsonPath &path);
-    Wrong noteValues(const RowList &rows, const WrittenRecord &record);
-    Wrong noteValue(const ColumnRemarks &column, const RowList &rows, const WrittenRecord &record);
-    InputError inTemplate(TemplatePart part, const QString &variable, const WrittenRecord &record,
-                          const QString &text) const;
+    Wrong noteValues(RowList &rows, const std::optional<SourceColumns> &columns, const WrittenRecord &record);
+    Wrong noteValue(const ColumnRemarks &column, bool isRead, RowList &rows, const WrittenRecord &record);
+    InputError inTemplate(TemplatePart part, const QString &variable, const WrittenRecord &record, const QString &text);
 
     const Job &job_;
     const JsonSource &source_;
@@ -90,6 +92,10 @@ private:
     const Placeholders *placeholders_ = nullptr;
     std::vector<StepFit> *fits_ = nullptr; ///< null where nobody measures
     std::unique_ptr<FormatWidths> widths_;
+    std::unique_ptr<VariablePlaces>
+        places_; ///< of the template; null until one is asked for, and where it cannot be read
+    bool arePlacesRead_ = false;
+    QSet<QString> notedUnits_; ///< data sets and keys of units
 };
 
 } // namespace kareport

@@ -3,6 +3,7 @@
 #include "TextFolding.h"
 #include "Xlate.h"
 
+#include <QJsonObject>
 #include <QVariant>
 
 #include <algorithm>
@@ -67,7 +68,7 @@ void storeJsonObject(const JsonNode &node, const FindVariable &findVariable, UDa
 
 JsonObjectList::JsonObjectList(const JsonSource &source, const JsonPath &path, const FindVariable &findVariable,
                                bool firstOnly, ReadProgress progress)
-    : progress_(std::move(progress))
+    : source_(source), path_(path), progress_(std::move(progress))
 {
     columns_.source = source.path();
     const SeeMember seeMember = [&](const JsonNode &member, const QString &name, const ValueParser *parser) {
@@ -78,7 +79,9 @@ JsonObjectList::JsonObjectList(const JsonSource &source, const JsonPath &path, c
         const auto *name = std::get_if<QString>(&step);
         values = name != nullptr ? values[*name] : values[std::get<qsizetype>(step)];
     }
-    if (values.isObject()) {
+    isObject_ = values.isObject();
+    hasRow_ = isObject_ || values.size() > 0;
+    if (isObject_) {
         storeJsonObject(values, findVariable, Add(), seeMember);
         return;
     }
@@ -104,6 +107,42 @@ void JsonObjectList::noteMember(const JsonSource &source, const JsonNode &member
     const bool needsPlace = parser == nullptr && names_.size() <= mostPlaces;
     const auto place = needsPlace ? source.errorAt(member.path(), QString(), true).place : std::nullopt;
     columns_.columns.push_back({name, place, parser != nullptr});
+}
+
+std::optional<SourceColumns> JsonObjectList::columns() const
+{
+    // Without a row nobody knows what keys there would be.
+    return hasRow_ ? std::optional(columns_) : std::nullopt;
+}
+
+void JsonObjectList::Sort(const std::vector<unsigned> &ids)
+{
+    isSorted_ = !ids.empty();
+    UDataObjectList::Sort(ids);
+}
+
+ValuePlace JsonObjectList::placeOf(std::size_t index, const QString &variable)
+{
+    if (isSorted_) {
+        return {source_.path()};
+    }
+    JsonPath row = path_;
+    if (!isObject_) {
+        row.emplace_back(static_cast<qsizetype>(index));
+    }
+    QJsonValue object = source_.root();
+    for (const auto &step : row) {
+        const auto *name = std::get_if<QString>(&step);
+        object = name != nullptr ? object[*name] : object[std::get<qsizetype>(step)];
+    }
+    for (const QString &key : object.toObject().keys()) {
+        if (equalFolded(key, variable)) {
+            row.emplace_back(key);
+            break;
+        }
+    }
+    const InputError found = source_.errorAt(row, QString());
+    return {found.file, found.place};
 }
 
 UDataObject *JsonObjectList::GetAt(std::size_t index)

@@ -24,6 +24,7 @@ void storeJsonObject(const JsonNode &node, const FindVariable &findVariable, UDa
 class JsonObjectList : public RowList
 {
 public:
+    /// @param source     must live longer
     /// @param path       leads to the values
     /// @param firstOnly  whether one row is enough, and those after it are not looked at
     /// @param progress   receives now and then the number of rows handed out. May be empty
@@ -32,11 +33,18 @@ public:
 
     UDataObject *GetAt(std::size_t index) override;
     std::optional<InputError> error() const override { return error_; }
-    std::optional<SourceColumns> columns() const override { return columns_; }
+    std::optional<SourceColumns> columns() const override;
+    ValuePlace placeOf(std::size_t index, const QString &variable) override;
+    void Sort(const std::vector<unsigned> &ids) override;
 
 private:
     void noteMember(const JsonSource &source, const JsonNode &member, const QString &name, const ValueParser *parser);
 
+    const JsonSource &source_;
+    JsonPath path_;
+    bool isObject_ = false;
+    bool hasRow_ = false;
+    bool isSorted_ = false;
     std::optional<InputError> error_;
     SourceColumns columns_;
     QSet<QString> names_; ///< of the columns

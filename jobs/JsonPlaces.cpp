@@ -1,11 +1,11 @@
 #include "JsonPlaces.h"
 
+#include "JsonWalker.h"
+
 #include <QJsonArray>
 #include <QJsonDocument>
 
 #include <algorithm>
-#include <tuple>
-#include <utility>
 
 namespace kareport
 {
@@ -13,81 +13,28 @@ namespace kareport
 namespace
 {
 
-/// Walks over a JSON text that is known to be one.
-class JsonWalker
+/// Places of this many bytes are kept.
+constexpr qsizetype bytesBetween = 4096;
+
+constexpr qsizetype byteOrderMark = 3;
+
+/// Goes over bytes of UTF-8. @return the place after them
+TextPlace placeAfter(TextPlace place, QByteArrayView bytes)
 {
-public:
-    explicit JsonWalker(const QByteArray &json) : json_(json) {}
-
-    qsizetype at() const { return at_; }
-    void setAt(qsizetype at) { at_ = at; }
-
-    char peek()
-    {
-        while (at_ < json_.size() && (json_[at_] == ' ' || json_[at_] == '\t' || json_[at_] == '\n' ||
-                                      json_[at_] == '\r' || static_cast<unsigned char>(json_[at_]) >= 0x80))
-        {
-            ++at_; // white space, and a byte-order mark in front
-        }
-        return at_ < json_.size() ? json_[at_] : '\0';
-    }
-    void take()
-    {
-        peek();
-        ++at_;
-    }
-
-    /// The bytes of a string, as they are between its quotes.
-    QByteArrayView takeString()
-    {
-        peek();
-        const qsizetype begin = ++at_;
-        while (at_ < json_.size() && json_[at_] != '"') {
-            at_ += json_[at_] == '\\' ? 2 : 1;
-        }
-        const qsizetype end = std::min(at_, json_.size());
-        ++at_;
-        return QByteArrayView(json_).sliced(begin, end - begin);
-    }
-
-    void skipWord()
-    {
-        while (at_ < json_.size() && !QByteArrayView(",:]} \t\r\n").contains(json_[at_])) {
-            ++at_;
+    for (const char byte : bytes) {
+        if (byte == '\n') {
+            place = {place.line + 1, 1};
+        } else if ((static_cast<unsigned char>(byte) & 0xC0U) != 0x80U) {
+            ++place.column;
         }
     }
+    return place;
+}
 
-    void skipValue()
-    {
-        int depth = 0;
-        do {
-            const char next = peek();
-            if (next == '\0') {
-                return;
-            }
-            if (next == '"') {
-                takeString();
-            } else if (next == '{' || next == '[') {
-                ++depth;
-                ++at_;
-            } else if (next == '}' || next == ']') {
-                --depth;
-                ++at_;
-            } else if (next == ',' || next == ':') {
-                ++at_;
-            } else {
-                skipWord();
-            }
-        } while (depth > 0);
-    }
-
-private:
-    const QByteArray &json_;
-    qsizetype at_ = 0;
-};
+} // namespace
 
 /// The text of a string's bytes.
-QString textOf(QByteArrayView bytes)
+QString textOfJsonString(QByteArrayView bytes)
 {
     if (!bytes.contains('\\')) {
         return QString::fromUtf8(bytes);
@@ -96,147 +43,143 @@ QString textOf(QByteArrayView bytes)
     return QJsonDocument::fromJson(literal).array().first().toString();
 }
 
-struct Found
-{
-    qsizetype key;
-    qsizetype value;
-};
-
-std::optional<Found> findMember(JsonWalker &walker, const QString &name)
-{
-    std::optional<Found> found;
-    walker.take();
-    while (walker.peek() == '"') {
-        const qsizetype key = walker.at();
-        const bool matches = textOf(walker.takeString()) == name;
-        walker.peek();
-        walker.take(); // the colon
-        walker.peek();
-        if (matches) {
-            found = Found{key, walker.at()};
-        }
-        walker.skipValue();
-        if (walker.peek() == ',') {
-            walker.take();
-        }
-    }
-    return found;
-}
-
-std::optional<Found> findElement(JsonWalker &walker, qsizetype index)
-{
-    walker.take();
-    for (qsizetype i = 0; walker.peek() != ']' && walker.peek() != '\0'; ++i) {
-        if (i == index) {
-            return Found{walker.at(), walker.at()};
-        }
-        walker.skipValue();
-        if (walker.peek() == ',') {
-            walker.take();
-        }
-    }
-    return std::nullopt;
-}
-
-struct Key
-{
-    QByteArray name;
-    qsizetype at;
-
-    bool operator<(const Key &other) const { return std::tie(name, at) < std::tie(other.name, other.at); }
-};
-
-/// The keys of an object, or those of none when a list is open.
-struct OpenGroup
-{
-    bool isObject = false;
-    std::vector<Key> keys;
-};
-
-/// The first key of an object that has been there before, and that one.
-std::optional<std::pair<Key, Key>> repeatedIn(std::vector<Key> &keys)
-{
-    std::sort(keys.begin(), keys.end());
-    std::optional<std::pair<Key, Key>> found;
-    for (std::size_t i = 1; i < keys.size(); ++i) {
-        if (keys[i].name == keys[i - 1].name && (!found || keys[i].at < found->second.at)) {
-            found = {keys[i - 1], keys[i]};
-        }
-    }
-    return found;
-}
-
-/// The name of a key: the bytes as they are, unless escapes hide what they say.
-QByteArray nameOf(QByteArrayView bytes)
-{
-    return bytes.contains('\\') ? textOf(bytes).toUtf8() : QByteArray::fromRawData(bytes.data(), bytes.size());
-}
-
-} // namespace
-
-std::optional<RepeatedKey> findRepeatedKey(const QByteArray &json)
-{
-    JsonWalker walker(json);
-    std::vector<OpenGroup> groups; // used again at each depth: objects are many
-    std::size_t depth = 0;
-    bool isKeyNext = false;
-    for (char next = walker.peek(); next != '\0'; next = walker.peek()) {
-        const qsizetype at = walker.at();
-        if (next == '"') {
-            const QByteArrayView bytes = walker.takeString();
-            if (isKeyNext) {
-                groups[depth - 1].keys.push_back({nameOf(bytes), at});
-            }
-            isKeyNext = false;
-            continue;
-        }
-        if (next == '{' || next == '[') {
-            if (depth == groups.size()) {
-                groups.emplace_back();
-            }
-            groups[depth].isObject = next == '{';
-            groups[depth++].keys.clear();
-        } else if (next == '}' || next == ']') {
-            if (const auto repeated = repeatedIn(groups[--depth].keys)) {
-                return RepeatedKey{QString::fromUtf8(repeated->second.name), placeOfByte(json, repeated->second.at),
-                                   placeOfByte(json, repeated->first.at).line};
-            }
-        } else if (next != ',' && next != ':') {
-            walker.skipWord();
-            continue;
-        }
-        walker.take();
-        isKeyNext = (next == '{' || next == ',') && groups[depth - 1].isObject;
-    }
-    return std::nullopt;
-}
-
 TextPlace placeOfByte(const QByteArray &text, qsizetype byte)
 {
     const QString before = QString::fromUtf8(text.first(std::clamp<qsizetype>(byte, 0, text.size())));
     return TextPlaces(before).of(before.size());
 }
 
-std::optional<TextPlace> placeInJson(const QByteArray &json, const JsonPath &path, bool ofKey)
+/// Goes over what is in a list or an object.
+/// @param visit  is told the name of each member, or the index of each element, and where it is; its false ends it
+template <typename Visit>
+void JsonPlaces::visitChildren(qsizetype at, const Visit &visit) const
 {
-    JsonWalker walker(json);
+    JsonWalker walker(json_);
+    walker.setAt(at);
+    const char kind = walker.peek();
+    if (kind != '{' && kind != '[') {
+        return;
+    }
+    walker.take();
+    char next = walker.peek();
+    for (qsizetype index = 0; next != '}' && next != ']' && next != '\0'; ++index, next = walker.peek()) {
+        const qsizetype key = walker.at();
+        Step step = index;
+        if (kind == '{') {
+            step = textOfJsonString(walker.takeString());
+            walker.peek();
+            walker.take(); // the colon
+            walker.peek();
+        }
+        if (!visit(step, Found{key, walker.at()})) {
+            return;
+        }
+        walker.skipValue();
+        if (walker.peek() == ',') {
+            walker.take();
+        }
+    }
+}
+
+/// What is in a list or an object, to be kept.
+JsonPlaces::Children JsonPlaces::childrenAt(qsizetype at) const
+{
+    Children children;
+    visitChildren(at, [&children](const Step &step, const Found &found) {
+        if (const auto *name = std::get_if<QString>(&step)) {
+            children.members.insert(*name, found);
+        } else {
+            children.elements.push_back(found);
+        }
+        return true;
+    });
+    return children;
+}
+
+/// One of them, where they are not kept: a list of rows may be long.
+std::optional<JsonPlaces::Found> JsonPlaces::childAt(qsizetype at, const Step &step) const
+{
+    std::optional<Found> found;
+    visitChildren(at, [&](const Step &other, const Found &child) {
+        if (other == step) {
+            found = child;
+        }
+        return !found || std::holds_alternative<QString>(step); // the last member of a name counts
+    });
+    return found;
+}
+
+std::optional<JsonPlaces::Found> JsonPlaces::childIn(const Children &children, const Step &step)
+{
+    if (const auto *name = std::get_if<QString>(&step)) {
+        const auto found = children.members.constFind(*name);
+        return found != children.members.constEnd() ? std::optional(*found) : std::nullopt;
+    }
+    const auto index = static_cast<std::size_t>(std::get<qsizetype>(step));
+    return index < children.elements.size() ? std::optional(children.elements[index]) : std::nullopt;
+}
+
+const JsonPlaces::Children &JsonPlaces::childrenOf(const QString &name, qsizetype at)
+{
+    auto known = inRoot_.find(name);
+    if (known == inRoot_.end()) {
+        known = inRoot_.insert(name, childrenAt(at));
+    }
+    return *known;
+}
+
+/// What a step of a path leads to. @param parent  what the steps before it lead to
+std::optional<JsonPlaces::Found> JsonPlaces::find(const JsonPath &path, std::size_t step, const Found &parent)
+{
+    if (step == 0) {
+        if (!root_) {
+            root_ = std::make_unique<Children>(childrenAt(parent.value));
+        }
+        return childIn(*root_, path[0]);
+    }
+    const auto *name = std::get_if<QString>(&path[0]);
+    return step == 1 && name != nullptr ? childIn(childrenOf(*name, parent.value), path[1])
+                                        : childAt(parent.value, path[step]);
+}
+
+std::optional<TextPlace> JsonPlaces::of(const JsonPath &path, bool ofKey)
+{
+    JsonWalker walker(json_);
     walker.peek();
     Found place = {walker.at(), walker.at()};
-    for (const auto &step : path) {
-        walker.setAt(place.value);
-        const char kind = walker.peek();
-        std::optional<Found> found;
-        if (const auto *name = std::get_if<QString>(&step)) {
-            found = kind == '{' ? findMember(walker, *name) : std::nullopt;
-        } else {
-            found = kind == '[' ? findElement(walker, std::get<qsizetype>(step)) : std::nullopt;
-        }
+    for (std::size_t step = 0; step < path.size(); ++step) {
+        const auto found = find(path, step, place);
         if (!found) {
             return std::nullopt;
         }
         place = *found;
     }
-    return placeOfByte(json, ofKey ? place.key : place.value);
+    return placeOf(ofKey ? place.key : place.value);
+}
+
+/// The place of a byte, from the last one before it that is known.
+TextPlace JsonPlaces::placeOf(qsizetype byte)
+{
+    byte = std::clamp<qsizetype>(byte, 0, json_.size());
+    if (marks_.empty()) {
+        marks_.emplace_back(); // of the first byte; a byte-order mark has no column
+    }
+    const qsizetype start = json_.startsWith("\xEF\xBB\xBF") ? byteOrderMark : 0;
+    const auto between = [this, start](qsizetype from, qsizetype to) {
+        from = std::max(from, start);
+        return QByteArrayView(json_).sliced(from, std::max<qsizetype>(to - from, 0));
+    };
+    const auto wanted = static_cast<std::size_t>(byte / bytesBetween);
+    while (marks_.size() <= wanted) {
+        const qsizetype from = static_cast<qsizetype>(marks_.size() - 1) * bytesBetween;
+        marks_.push_back(placeAfter(marks_.back(), between(from, from + bytesBetween)));
+    }
+    return placeAfter(marks_[wanted], between(static_cast<qsizetype>(wanted) * bytesBetween, byte));
+}
+
+std::optional<TextPlace> placeInJson(const QByteArray &json, const JsonPath &path, bool ofKey)
+{
+    return JsonPlaces(json).of(path, ofKey);
 }
 
 } // namespace kareport

@@ -1,5 +1,6 @@
 #include "JsonSource.h"
 
+#include "NearestName.h"
 #include "Xlate.h"
 
 #include <QFile>
@@ -40,7 +41,7 @@ constexpr qsizetype longestQuote = 100;
 
 QString quoteOf(const QString &text)
 {
-    return text.size() > longestQuote ? text.left(longestQuote) + u'…' : text;
+    return shortened(text, longestQuote);
 }
 
 /// A value from the command line: JSON where it is some, else the text itself. @return what is wrong with it
@@ -127,7 +128,7 @@ Expected<JsonSource> JsonSource::fromBytes(const QString &path, const QByteArray
     }
     JsonSource source;
     source.path_ = path;
-    source.bytes_ = bytes;
+    source.places_ = std::make_shared<JsonPlaces>(bytes);
     source.root_ = document.object();
     return source;
 }
@@ -178,15 +179,15 @@ InputError JsonSource::errorAt(const JsonPath &path, const QString &text, bool a
             return {QStringLiteral("--set %1=%2").arg(withDots(given), *set), std::nullopt, text};
         }
     }
-    if (bytes_.isEmpty()) {
+    if (!places_) {
         return {path_, std::nullopt, text};
     }
     // What is missing is reported at the place of its parent.
     JsonPath known = path;
-    auto place = placeInJson(bytes_, known, atKey);
+    auto place = places_->of(known, atKey);
     while (!place && !known.empty()) {
         known.pop_back();
-        place = placeInJson(bytes_, known);
+        place = places_->of(known);
     }
     return {path_, place, text};
 }

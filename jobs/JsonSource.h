@@ -9,6 +9,7 @@
 #include <QJsonValue>
 #include <QString>
 
+#include <memory>
 #include <optional>
 
 namespace kareport
@@ -47,7 +48,7 @@ public:
 
 private:
     QString path_;
-    QByteArray bytes_;
+    std::shared_ptr<JsonPlaces> places_; ///< in the file; null for what is in none
     QJsonValue root_;
     QHash<QString, QString> setTexts_; ///< by the path with dots
     QHash<QString, QString> options_;  ///< of the command line, by the same

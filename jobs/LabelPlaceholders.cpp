@@ -3,7 +3,6 @@
 #include "Placeholders.h"
 #include "TemplateElements.h"
 #include "TemplateFile.h"
-#include "TextFolding.h"
 #include "TextPlaces.h"
 
 namespace kareport
@@ -39,15 +38,13 @@ std::optional<InputError> wrongLabelPlaceholder(const QString &path, const QStri
     if (!file) {
         return std::nullopt;
     }
-    std::optional<WrongLabel> wrong; // of the last template of the name, which is the one that is loaded
     const ScanText text = file->scanText();
-    TemplateSequence sequence(text);
-    while (const auto element = sequence.next()) {
-        if (equalFolded(element->name.value.view(), name)) {
-            wrong = wrongLabelIn(readTableElements(element->body.value));
-            wrong = wrong ? wrong : wrongLabelIn(readBlockElements(element->body.value));
-        }
+    const auto element = findTemplate(text, name);
+    if (!element) {
+        return std::nullopt;
     }
+    auto wrong = wrongLabelIn(readTableElements(element->body.value));
+    wrong = wrong ? wrong : wrongLabelIn(readBlockElements(element->body.value));
     return wrong ? std::optional(InputError{path, TextPlaces(file->text()).of(wrong->source), wrong->text})
                  : std::nullopt;
 }

@@ -29,13 +29,7 @@ FormatWidths::FormatWidths(const QString &path, const QString &name)
         return;
     }
     const ScanText text = file->scanText();
-    std::optional<TemplateElement> chosen; // the last one of the name is loaded
-    TemplateSequence sequence(text);
-    while (auto element = sequence.next()) {
-        if (equalFolded(element->name.value.view(), name)) {
-            chosen = std::move(element);
-        }
-    }
+    const auto chosen = findTemplate(text, name);
     if (!chosen) {
         return;
     }

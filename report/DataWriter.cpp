@@ -46,6 +46,17 @@ void addShown(DataRemarks &remarks, ColumnRemarks &column, Shown shown, quint64 
     }
 }
 
+/// Counts a value that is not there by how it shows.
+void addMissing(DataRemarks &remarks, ColumnRemarks &column, const FieldFormatter &field, const FormatOptions &options,
+                quint64 row)
+{
+    if (field.showsZeroForNone(options)) {
+        remarks.add(column.missing, row);
+    } else if (field.showsZeroForNone(FormatOptions())) {
+        remarks.add(column.blank, row);
+    }
+}
+
 } // namespace
 
 QString withChainageLabel(QString heading, const QString &label)
@@ -77,7 +88,9 @@ void DataWriter::writeBlock(const UXmlReportBlock &block, const UDataObject &obj
         WidestText *widest = about != nullptr && remarks->measures ? &about->widest : nullptr;
         const Shown shown = formatter.append(row_, options_, entry->kind(), entry->GetData(), QStringView(), widest);
         // No column follows that a wide value would move: only what shows as "#" is lost.
-        if (about != nullptr && (shown != Shown::TooWide || options_.printHash)) {
+        if (about != nullptr && !formatter.shows(entry->kind())) {
+            addMissing(*remarks, *about, formatter, options_, 0);
+        } else if (about != nullptr && (shown != Shown::TooWide || options_.printHash)) {
             addShown(*remarks, *about, shown, 0);
         }
         row_.trim(start);
@@ -178,17 +191,14 @@ void DataWriter::formatRow(const std::vector<FieldFormatter> &fields, const UDat
             const UDictEntry *entry = object.Find(field.id());
             WidestText *const widest = remarks.measures ? &about.widest : nullptr;
             const qsizetype widestBefore = about.widest.width;
-            if (entry != nullptr) {
-                addShown(remarks, about, field.append(row_, options_, entry->kind(), entry->GetData(), suffix, widest),
-                         row);
-            } else {
-                const Shown shown = field.append(row_, options_, ValueKind::None, nullptr, suffix, widest);
+            const Shown shown = entry != nullptr
+                                    ? field.append(row_, options_, entry->kind(), entry->GetData(), suffix, widest)
+                                    : field.append(row_, options_, ValueKind::None, nullptr, suffix, widest);
+            if (entry != nullptr && field.shows(entry->kind())) {
+                addShown(remarks, about, shown, row);
+            } else { // a text that another variable of the same identifier has is no number
                 about.wideZeros += shown == Shown::TooWide ? 1U : 0U;
-                if (field.showsZeroForNone(options_)) {
-                    remarks.add(about.missing, row);
-                } else if (field.showsZeroForNone(FormatOptions())) {
-                    remarks.add(about.blank, row);
-                }
+                addMissing(remarks, about, field, options_, row);
             }
             if (about.widest.width != widestBefore) {
                 remarks.addWidest(about, row);

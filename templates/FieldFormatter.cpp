@@ -66,8 +66,22 @@ FieldFormatter::FieldFormatter(const sXmlReportField &field)
       width_(field.Width),
       decimals_(field.Decimals),
       type_(field.Type),
-      id_(static_cast<quint32>(field.ID))
+      id_(static_cast<quint32>(field.ID)),
+      kinds_(kindsOf(field.Type))
 {}
+
+int FieldFormatter::kindsOf(qint32 type)
+{
+    switch (type) {
+    case VARIABLE_INTEGER: return static_cast<int>(ValueKind::Int16) | static_cast<int>(ValueKind::Int32);
+    case VARIABLE_TEXT:
+    case VARIABLE_NAME:
+    case VARIABLE_NUMBER: return static_cast<int>(ValueKind::Text) | static_cast<int>(ValueKind::PointNumber);
+    case VARIABLE_BOOLEAN:
+    case VARIABLE_FLAG: return static_cast<int>(ValueKind::Boolean);
+    default: return static_cast<int>(ValueKind::Double);
+    }
+}
 
 Shown FieldFormatter::append(TextBuffer &out, const FormatOptions &options, ValueKind kind, const void *value,
                              QStringView suffix, WidestText *widest) const

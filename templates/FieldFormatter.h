@@ -37,6 +37,10 @@ public:
 
     FieldMarker marker() const { return marker_; }
     quint32 id() const { return id_; }
+    /// The kinds of values that a type shows, together; a value of any other kind counts as none.
+    static int kindsOf(qint32 type);
+    /// Whether a value of a kind shows as what it is.
+    bool shows(ValueKind kind) const { return (kinds_ & static_cast<int>(kind)) != 0; }
     /// Whether a value that is missing shows as a number 0.
     bool showsZeroForNone(const FormatOptions &options) const;
 
@@ -72,6 +76,7 @@ private:
     qint32 decimals_;
     qint32 type_;
     quint32 id_;
+    int kinds_;
 };
 
 } // namespace kareport

@@ -1,5 +1,7 @@
 #include "TemplateElements.h"
 
+#include "TextFolding.h"
+
 namespace kareport
 {
 
@@ -82,6 +84,18 @@ std::vector<TemplateElement> readTemplateElements(const ScanText &file, ScanNote
         templates.push_back(std::move(*element));
     }
     return templates;
+}
+
+std::optional<TemplateElement> findTemplate(const ScanText &file, QStringView name)
+{
+    std::optional<TemplateElement> last;
+    TemplateSequence sequence(file);
+    while (auto element = sequence.next()) {
+        if (equalFolded(element->name.value.view(), name)) {
+            last.emplace(std::move(*element));
+        }
+    }
+    return last;
 }
 
 std::vector<OutputElement> readTableElements(const ScanText &body, ScanNotes *notes)

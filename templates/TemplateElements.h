@@ -81,6 +81,9 @@ private:
 /// The templates of a whole file, in file order.
 std::vector<TemplateElement> readTemplateElements(const ScanText &file, ScanNotes *notes = nullptr);
 
+/// The template of a name, without regard to case: of several the last one, as for loading. Nothing where there is none.
+std::optional<TemplateElement> findTemplate(const ScanText &file, QStringView name);
+
 // The parts of one template's body.
 std::vector<OutputElement> readTableElements(const ScanText &body, ScanNotes *notes = nullptr);
 std::vector<OutputElement> readBlockElements(const ScanText &body, ScanNotes *notes = nullptr);

@@ -4,64 +4,78 @@
 #include "TextFolding.h"
 #include "TextPlaces.h"
 
+#include <QSet>
+
 namespace kareport
 {
 
 namespace
 {
 
-/// The body of the last template of a name.
-std::optional<ScanText> bodyOf(const ScanText &file, const QString &name)
+/// No name has a line feed: values lose theirs.
+QString keyOf(TemplatePart part, QStringView record)
 {
-    std::optional<ScanText> body;
-    for (const TemplateElement &element : readTemplateElements(file)) {
-        if (equalFolded(element.name.value.view(), name)) {
-            body = element.body.value;
-        }
-    }
-    return body;
+    return QString::number(static_cast<int>(part)) + u'\n' + foldedKey(record) + u'\n';
 }
 
-/// The elements that name the variables of a record.
-std::vector<ScanElement> namesIn(const ScanText &body, TemplatePart part, const QString &record)
+/// Finds the places of the variables that records name.
+class Places
 {
-    if (part == TemplatePart::SortKey) {
-        for (const SortElement &sort : readSortElements(body)) {
-            if (equalFolded(sort.name.value.view(), record)) {
-                return sort.variableNames;
+public:
+    Places(const QString &text, QHash<QString, TextPlace> &places) : places_(places), of_(text) {}
+
+    /// Adds the names of a record, unless there was one of its name before.
+    template <typename Elements, typename NameOf>
+    void add(TemplatePart part, const ScanElement &record, const Elements &elements, const NameOf &nameOf)
+    {
+        const QString front = keyOf(part, record.value.view());
+        if (records_.contains(front)) {
+            return;
+        }
+        records_.insert(front);
+        for (const auto &element : elements) {
+            const ScanElement &name = nameOf(element);
+            const QString key = front + foldedKey(name.value.view());
+            if (name.exists() && !places_.contains(key)) {
+                places_.insert(key, of_.of(name.source));
             }
         }
-        return {};
     }
-    std::vector<ScanElement> names;
-    for (const OutputElement &output : part == TemplatePart::Table ? readTableElements(body) : readBlockElements(body))
-    {
-        if (!equalFolded(output.name.value.view(), record)) {
-            continue;
-        }
-        for (const FieldElement &field : output.fields) {
-            names.push_back(field.variableName);
-        }
-        break;
-    }
-    return names;
-}
+
+private:
+    QHash<QString, TextPlace> &places_;
+    TextPlaces of_;
+    QSet<QString> records_;
+};
 
 } // namespace
 
-std::optional<TextPlace> placeOfVariable(const TemplateFile &file, const QString &templateName, TemplatePart part,
-                                         const QString &record, const QString &variable)
+VariablePlaces::VariablePlaces(const TemplateFile &file, const QString &templateName)
 {
-    const auto body = bodyOf(file.scanText(), templateName);
-    if (!body) {
-        return std::nullopt;
+    const ScanText text = file.scanText();
+    const auto chosen = findTemplate(text, templateName);
+    if (!chosen) {
+        return;
     }
-    for (const ScanElement &name : namesIn(*body, part, record)) {
-        if (name.exists() && equalFolded(name.value.view(), variable)) {
-            return TextPlaces(file.text()).of(name.source);
-        }
+    const ScanText &body = chosen->body.value;
+    Places places(file.text(), places_);
+    const auto nameOfField = [](const FieldElement &field) -> const ScanElement & { return field.variableName; };
+    for (const OutputElement &table : readTableElements(body)) {
+        places.add(TemplatePart::Table, table.name, table.fields, nameOfField);
     }
-    return std::nullopt;
+    for (const OutputElement &block : readBlockElements(body)) {
+        places.add(TemplatePart::Block, block.name, block.fields, nameOfField);
+    }
+    for (const SortElement &sort : readSortElements(body)) {
+        places.add(TemplatePart::SortKey, sort.name, sort.variableNames,
+                   [](const ScanElement &name) -> const ScanElement & { return name; });
+    }
+}
+
+std::optional<TextPlace> VariablePlaces::of(TemplatePart part, const QString &record, const QString &variable) const
+{
+    const auto found = places_.constFind(keyOf(part, record) + foldedKey(variable));
+    return found != places_.constEnd() ? std::optional(*found) : std::nullopt;
 }
 
 } // namespace kareport

@@ -4,6 +4,7 @@
 #include "TemplateFile.h"
 #include "TextPlace.h"
 
+#include <QHash>
 #include <QString>
 
 #include <optional>
@@ -19,13 +20,21 @@ enum class TemplatePart
     SortKey ///< of a table
 };
 
-/// Where a template of a file names a variable for the first time in a table, in a block or among the sort keys of a table.
-/// @param templateName  without regard to case; of several templates of the name the last one, as for loading
-/// @param record        the table or block
-/// @return nothing when the variable is not named there
-/// @throws std::bad_alloc
-KAREPORT_EXPORT std::optional<TextPlace> placeOfVariable(const TemplateFile &file, const QString &templateName,
-                                                         TemplatePart part, const QString &record,
-                                                         const QString &variable);
+/// Where a template of a file names variables: for the first time in a table, in a block or among the sort keys of a table.
+class KAREPORT_EXPORT VariablePlaces
+{
+public:
+    /// Reads the template. @param templateName  without regard to case; of several templates of the name the last one, as for
+    ///                                         loading. Without such a template there are no places
+    /// @throws std::bad_alloc
+    VariablePlaces(const TemplateFile &file, const QString &templateName);
+
+    /// The place of a variable. @param record  the table or block; of several of a name the first one
+    /// @return nothing when the variable is not named there
+    std::optional<TextPlace> of(TemplatePart part, const QString &record, const QString &variable) const;
+
+private:
+    QHash<QString, TextPlace> places_;
+};
 
 } // namespace kareport

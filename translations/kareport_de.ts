@@ -15,13 +15,13 @@
     </message>
     <message>
         <location filename="../host/app/NearestName.cpp"/>
-        <source>none</source>
-        <translation>keine</translation>
+        <source>one of %1 was expected</source>
+        <translation>einer dieser Werte wurde erwartet: %1</translation>
     </message>
     <message>
         <location filename="../host/app/NearestName.cpp"/>
-        <source>one of %1 was expected</source>
-        <translation>einer dieser Werte wurde erwartet: %1</translation>
+        <source>none</source>
+        <translation>keine</translation>
     </message>
     <message>
         <location filename="../host/app/ReplaceFile.cpp"/>
@@ -295,6 +295,11 @@
     </message>
     <message>
         <location filename="../formats/pdf/PdfNotes.cpp"/>
+        <source>no font has the character "%1" (U+%2), first in line %3, %4 times in all</source>
+        <translation>keine Schrift enthält das Zeichen „%1“ (U+%2), zuerst in Zeile %3, insgesamt %4-mal</translation>
+    </message>
+    <message>
+        <location filename="../formats/pdf/PdfNotes.cpp"/>
         <source>%1 wider than the page: the type is %2 points on all pages</source>
         <translation>%1 breiter als die Seite: die Schrift hat auf allen Seiten %2 Punkt</translation>
     </message>
@@ -302,11 +307,6 @@
         <location filename="../formats/pdf/PdfNotes.cpp"/>
         <source>%1 wider than the page in type of %2 points: what is too wide continues below</source>
         <translation>%1 auch bei %2 Punkt breiter als die Seite: was zu breit ist, steht darunter</translation>
-    </message>
-    <message>
-        <location filename="../formats/pdf/PdfNotes.cpp"/>
-        <source>no font has the character "%1" (U+%2), first in line %3, %4 times in all</source>
-        <translation>keine Schrift enthält das Zeichen „%1“ (U+%2), zuerst in Zeile %3, insgesamt %4-mal</translation>
     </message>
     <message>
         <location filename="../formats/pdf/PdfNotes.cpp"/>
@@ -964,6 +964,11 @@
         <location filename="../sources/GeometryColumns.cpp"/>
         <source>the value "%1" of the column "%2" does not fit: %3 was expected</source>
         <translation>der Wert "%1" der Spalte "%2" passt nicht: %3 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/GeometryColumns.cpp"/>
+        <source>no column is a variable of the dictionary: there are %1</source>
+        <translation>keine Spalte ist eine Variable des Wörterbuchs: vorhanden sind %1</translation>
     </message>
     <message>
         <location filename="../sources/PointGeometry.cpp"/>
@@ -1637,11 +1642,6 @@
         <translation>die Spalten "%1" und "%2" haben beide Geometrien: eine Abfrage mit einer davon wurde erwartet</translation>
     </message>
     <message>
-        <location filename="../sources/postgresql/PostgresColumns.cpp"/>
-        <source>no column is a variable of the dictionary: there are %1</source>
-        <translation>keine Spalte ist eine Variable des Wörterbuchs: vorhanden sind %1</translation>
-    </message>
-    <message>
         <location filename="../sources/postgresql/PostgresConnection.cpp"/>
         <source>the library libpq cannot be loaded: the package libpq5 was expected</source>
         <translation>die Bibliothek libpq kann nicht geladen werden: das Paket libpq5 wurde erwartet</translation>
@@ -1968,6 +1968,56 @@
     </message>
     <message>
         <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 value is wider than the field "%2" of the %3 "%4", in row %5, line %6 of the report</source>
+        <translation>%1 Wert ist breiter als das Feld "%2" (%3 "%4"), in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values are wider than the field "%2" of the %3 "%4", the first one in row %5, line %6 of the report</source>
+        <translation>%1 Werte sind breiter als das Feld "%2" (%3 "%4"), der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 value is wider than the field "%2" of the %3 "%4" and shows as #, in row %5, line %6 of the report</source>
+        <translation>%1 Wert ist breiter als das Feld "%2" (%3 "%4") und erscheint als #, in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values are wider than the field "%2" of the %3 "%4" and show as #, the first one in row %5, line %6 of the report</source>
+        <translation>%1 Werte sind breiter als das Feld "%2" (%3 "%4") und erscheinen als #, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 value of the field "%2" of the %3 "%4" is infinite or not a number, in row %5, line %6 of the report</source>
+        <translation>%1 Wert des Felds "%2" (%3 "%4") ist unendlich oder keine Zahl, in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values of the field "%2" of the %3 "%4" are infinite or not a number, the first one in row %5, line %6 of the report</source>
+        <translation>%1 Werte des Felds "%2" (%3 "%4") sind unendlich oder keine Zahl, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 value of the field "%2" of the %3 "%4" is missing and shows as 0, in row %5, line %6 of the report</source>
+        <translation>%1 Wert des Felds "%2" (%3 "%4") fehlt und erscheint als 0, in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as 0, the first one in row %5, line %6 of the report</source>
+        <translation>%1 Werte des Felds "%2" (%3 "%4") fehlen und erscheinen als 0, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 value of the field "%2" of the %3 "%4" is missing and shows as blanks, in row %5, line %6 of the report</source>
+        <translation>%1 Wert des Felds "%2" (%3 "%4") fehlt und erscheint als Leerzeichen, in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as blanks, the first one in row %5, line %6 of the report</source>
+        <translation>%1 Werte des Felds "%2" (%3 "%4") fehlen und erscheinen als Leerzeichen, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
         <source>the data "%1" does not say the unit of its numbers: %2 was taken</source>
         <translation>die Daten „%1“ sagen die Einheit ihrer Zahlen nicht: %2 wurde angenommen</translation>
     </message>
@@ -1990,31 +2040,6 @@
         <location filename="../jobs/JobStepNotes.cpp"/>
         <source>the sort key "%1" of the table "%2" is not a variable of the dictionary "%3"</source>
         <translation>der Sortierschlüssel "%1" der Tabelle "%2" ist keine Variable des Wörterbuchs "%3"</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values are wider than the field "%2" of the %3 "%4" and show as #, the first one in row %5, line %6 of the report</source>
-        <translation>%1 Werte sind breiter als das Feld "%2" (%3 "%4") und erscheinen als #, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values are wider than the field "%2" of the %3 "%4", the first one in row %5, line %6 of the report</source>
-        <translation>%1 Werte sind breiter als das Feld "%2" (%3 "%4"), der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values of the field "%2" of the %3 "%4" are infinite or not a number, the first one in row %5, line %6 of the report</source>
-        <translation>%1 Werte des Felds "%2" (%3 "%4") sind unendlich oder keine Zahl, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as 0, the first one in row %5, line %6 of the report</source>
-        <translation>%1 Werte des Felds "%2" (%3 "%4") fehlen und erscheinen als 0, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as blanks, the first one in row %5, line %6 of the report</source>
-        <translation>%1 Werte des Felds "%2" (%3 "%4") fehlen und erscheinen als Leerzeichen, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
     </message>
     <message>
         <location filename="../jobs/JobSteps.cpp"/>

@@ -15,13 +15,13 @@
     </message>
     <message>
         <location filename="../host/app/NearestName.cpp"/>
-        <source>none</source>
-        <translation>なし</translation>
+        <source>one of %1 was expected</source>
+        <translation>次のいずれかが必要です: %1</translation>
     </message>
     <message>
         <location filename="../host/app/NearestName.cpp"/>
-        <source>one of %1 was expected</source>
-        <translation>次のいずれかが必要です: %1</translation>
+        <source>none</source>
+        <translation>なし</translation>
     </message>
     <message>
         <location filename="../host/app/ReplaceFile.cpp"/>
@@ -295,6 +295,11 @@
     </message>
     <message>
         <location filename="../formats/pdf/PdfNotes.cpp"/>
+        <source>no font has the character "%1" (U+%2), first in line %3, %4 times in all</source>
+        <translation>文字「%1」(U+%2) を含むフォントがありません (最初は %3 行目、全 %4 回)</translation>
+    </message>
+    <message>
+        <location filename="../formats/pdf/PdfNotes.cpp"/>
         <source>%1 wider than the page: the type is %2 points on all pages</source>
         <translation>%1ページより幅が広いため、すべてのページの文字は %2 ポイントです</translation>
     </message>
@@ -302,11 +307,6 @@
         <location filename="../formats/pdf/PdfNotes.cpp"/>
         <source>%1 wider than the page in type of %2 points: what is too wide continues below</source>
         <translation>%1 %2 ポイントの文字でもページより幅が広いため、はみ出す部分は下の行に続きます</translation>
-    </message>
-    <message>
-        <location filename="../formats/pdf/PdfNotes.cpp"/>
-        <source>no font has the character "%1" (U+%2), first in line %3, %4 times in all</source>
-        <translation>文字「%1」(U+%2) を含むフォントがありません (最初は %3 行目、全 %4 回)</translation>
     </message>
     <message>
         <location filename="../formats/pdf/PdfNotes.cpp"/>
@@ -964,6 +964,11 @@
         <location filename="../sources/GeometryColumns.cpp"/>
         <source>the value "%1" of the column "%2" does not fit: %3 was expected</source>
         <translation>列 "%2" の値 "%1" は適合しません: %3 が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/GeometryColumns.cpp"/>
+        <source>no column is a variable of the dictionary: there are %1</source>
+        <translation>辞書の変数である列がありません: あるのは %1 です</translation>
     </message>
     <message>
         <location filename="../sources/PointGeometry.cpp"/>
@@ -1637,11 +1642,6 @@
         <translation>列 "%1" と "%2" の両方にジオメトリがあります: そのうち 1 つだけを含むクエリが必要です</translation>
     </message>
     <message>
-        <location filename="../sources/postgresql/PostgresColumns.cpp"/>
-        <source>no column is a variable of the dictionary: there are %1</source>
-        <translation>辞書の変数である列がありません: あるのは %1 です</translation>
-    </message>
-    <message>
         <location filename="../sources/postgresql/PostgresConnection.cpp"/>
         <source>the library libpq cannot be loaded: the package libpq5 was expected</source>
         <translation>ライブラリ libpq を読み込めません: パッケージ libpq5 が必要です</translation>
@@ -1968,6 +1968,56 @@
     </message>
     <message>
         <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 value is wider than the field "%2" of the %3 "%4", in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" より幅の広い値が %1 個あります。データの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values are wider than the field "%2" of the %3 "%4", the first one in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" より幅の広い値が %1 個あります。最初はデータの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 value is wider than the field "%2" of the %3 "%4" and shows as #, in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" より幅の広い値が %1 個あり、# で表示されます。データの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values are wider than the field "%2" of the %3 "%4" and show as #, the first one in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" より幅の広い値が %1 個あり、# で表示されます。最初はデータの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 value of the field "%2" of the %3 "%4" is infinite or not a number, in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" の値 %1 個が無限大または非数です。データの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values of the field "%2" of the %3 "%4" are infinite or not a number, the first one in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" の値 %1 個が無限大または非数です。最初はデータの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 value of the field "%2" of the %3 "%4" is missing and shows as 0, in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" の値が %1 個なく、0 と表示されます。データの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as 0, the first one in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" の値が %1 個なく、0 と表示されます。最初はデータの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 value of the field "%2" of the %3 "%4" is missing and shows as blanks, in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" の値が %1 個なく、空白で表示されます。データの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as blanks, the first one in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" の値が %1 個なく、空白で表示されます。最初はデータの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
         <source>the data "%1" does not say the unit of its numbers: %2 was taken</source>
         <translation>データ「%1」は数値の単位を示していません: %2 とみなしました</translation>
     </message>
@@ -1990,31 +2040,6 @@
         <location filename="../jobs/JobStepNotes.cpp"/>
         <source>the sort key "%1" of the table "%2" is not a variable of the dictionary "%3"</source>
         <translation>表 "%2" の並べ替えキー "%1" は辞書 "%3" の変数ではありません</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values are wider than the field "%2" of the %3 "%4" and show as #, the first one in row %5, line %6 of the report</source>
-        <translation>%3 "%4" のフィールド "%2" より幅の広い値が %1 個あり、# で表示されます。最初はデータの %5 行目、レポートの %6 行目です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values are wider than the field "%2" of the %3 "%4", the first one in row %5, line %6 of the report</source>
-        <translation>%3 "%4" のフィールド "%2" より幅の広い値が %1 個あります。最初はデータの %5 行目、レポートの %6 行目です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values of the field "%2" of the %3 "%4" are infinite or not a number, the first one in row %5, line %6 of the report</source>
-        <translation>%3 "%4" のフィールド "%2" の値 %1 個が無限大または非数です。最初はデータの %5 行目、レポートの %6 行目です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as 0, the first one in row %5, line %6 of the report</source>
-        <translation>%3 "%4" のフィールド "%2" の値が %1 個なく、0 と表示されます。最初はデータの %5 行目、レポートの %6 行目です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as blanks, the first one in row %5, line %6 of the report</source>
-        <translation>%3 "%4" のフィールド "%2" の値が %1 個なく、空白で表示されます。最初はデータの %5 行目、レポートの %6 行目です</translation>
     </message>
     <message>
         <location filename="../jobs/JobSteps.cpp"/>

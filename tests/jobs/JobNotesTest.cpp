@@ -10,6 +10,8 @@
 
 #include <gtest/gtest.h>
 
+#include <ctime>
+
 namespace
 {
 
@@ -32,6 +34,7 @@ void putData(const TestJob &job)
     job.folder.put("misspelt.csv", "Number,Nrothing\n1,12.5\n");
     job.folder.put("wide.csv", "Number,Northing\n123456,1\n");
     job.folder.put("more.csv", "Number,Northing,\"Code\"\n1,12.5,x\n");
+    job.folder.put("twice.csv", "Number,Northing,N\n1,12.5,13\n");
     job.folder.put("points.json",
                    "[{\"Number\": 1,\n  \"Code\": 5, \"Northing\": 1},\n {\"Number\": 2, \"Northing\": 2}]");
     geo::runSql(job.folder.path("points.db"), "CREATE TABLE points (Number TEXT, Code TEXT, Northing REAL)");
@@ -77,6 +80,8 @@ TEST(JobNotes, SayWhatDoesNotComeTogether)
         {R"("json": "points.json")", tableStep,
          "points.json:2:3: note: the column \"Code\" is not a variable of the dictionary \"Survey\"",
          "keys that show with the rows"},
+        {R"("csv": "twice.csv", "columns": {"Northing": "N"})", tableStep, "",
+         "a variable that is read from another column, as the job says"},
         {R"("sqlite": "points.db", "table": "points")", tableStep,
          "points.db: note: the column \"Code\" is not a variable of the dictionary \"Survey\"",
          "a database has no place"},
@@ -152,8 +157,8 @@ TEST(JobNotes, SayWhichValuesDoNotShowAsTheyAre)
          "report",
          "123456|", "wider than the column, which keeps them whole"},
         {"Number,Northing\n1,2\n123456,3\n", R"("options": {"printHash": true}, )",
-         "1 values are wider than the field \"Number\" of the table \"Points\" and show as #, the first one in row 2, "
-         "line 5 of the report",
+         "1 value is wider than the field \"Number\" of the table \"Points\" and shows as #, in row 2, line 5 of the "
+         "report",
          "#####|", "replaced"},
         {"Number,Northing\n123456,2\n", R"("options": {"excel": true}, )", "", "",
          "a spreadsheet has no columns to fit"},
@@ -206,12 +211,42 @@ TEST(JobNotes, CompareVariablesAndNotTheirIdentifiers)
     EXPECT_FALSE(job.error) << job.text().toStdString();
     QString notes = QString::fromStdString(notesOf(job));
     notes.remove(QRegularExpression(QStringLiteral("job\\.json:1:\\d+: note: ")));
-    EXPECT_EQ(notes.toStdString(),
-              "no column fills the field \"Elevation\" of the table \"Points\"; \"Code\" has the same "
-              "ID and shows there");
+    EXPECT_EQ(notes.toStdString(), "no column fills the field \"Elevation\" of the table \"Points\"")
+        << "the text of another variable is no number";
     job.folder.put("p.csv", "Code,Elevation\nx,\n,5\n");
     job.run(templateJob(R"("p": {"csv": "p.csv"})", tableStep));
-    EXPECT_EQ(notesOf(job), "") << "both are filled";
+    EXPECT_TRUE(job.text().startsWith(QStringLiteral("x    |    0.000\n"))) << job.text().toStdString();
+    notes = QString::fromStdString(notesOf(job));
+    notes.remove(QRegularExpression(QStringLiteral("job\\.json:1:\\d+: note: ")));
+    EXPECT_EQ(
+        notes.toStdString(),
+        "1 value of the field \"Elevation\" of the table \"Points\" is missing and shows as 0, in row 1, line 1 of "
+        "the report")
+        << "a zero that nobody gave";
+}
+
+TEST(JobNotes, NameTheVariableThatShowsInsteadOfAnother)
+{
+    using namespace markup;
+    const QByteArray table =
+        output("Table", "Points", "D", {field("Ground", "Ground", "9.3"), field("Elevation", "H", "9.3")});
+    const QByteArray dictionary = element(
+        "Dictionary", element("DictionaryName", "D") +
+                          element("VariableList",
+                                  joined({variable(3, "Ground", "ELEVATION"), variable(3, "Elevation", "ELEVATION")})));
+    TestJob job;
+    job.folder.put("t.xml",
+                   element("ReportTemplate", element("Name", "T") + element("Title", "t") + element("Tables", table) +
+                                                 element("Dictionaries", dictionary) +
+                                                 element("Options", separatorOption("124"))));
+    job.folder.put("p.csv", "Ground\n5\n");
+    job.run(templateJob(R"("p": {"csv": "p.csv"})", tableStep));
+    EXPECT_FALSE(job.error) << job.text().toStdString();
+    QString notes = QString::fromStdString(notesOf(job));
+    notes.remove(QRegularExpression(QStringLiteral("job\\.json:1:\\d+: note: ")));
+    EXPECT_EQ(notes.toStdString(),
+              "no column fills the field \"Elevation\" of the table \"Points\"; \"Ground\" has the same "
+              "ID and shows there");
 }
 
 TEST(JobNotes, SayWhichSortKeysAreNoVariables)
@@ -270,12 +305,11 @@ TEST(JobNotes, SayWhatABlockDoesNotShow)
         {R"({"Number": "1", "Northing": 2})", "", "", "all shows"},
         {R"({"Number": "123456", "Northing": 2})", "", "", "a block has no columns that a wide value would move"},
         {R"({"Number": "123456", "Northing": 2})", R"("options": {"printHash": true}, )",
-         "1 values are wider than the field \"Number\" of the block \"Point\" and show as #, the first one in row 1, line "
-         "2 of the report",
+         "1 value is wider than the field \"Number\" of the block \"Point\" and shows as #, in row 1, line 2 of the report",
          "nothing of it shows"},
         {R"({"Number": "1", "Northing": "INF"})", "",
-         "1 values of the field \"Northing\" of the block \"Point\" are infinite or not a number, the first one in row 1, "
-         "line 3 of the report",
+         "1 value of the field \"Northing\" of the block \"Point\" is infinite or not a number, in row 1, line 3 of the "
+         "report",
          "no elevation"},
     };
     for (const Row &row : rows) {
@@ -318,6 +352,144 @@ TEST(JobNotes, AreBounded)
     EXPECT_EQ(job.notes.said().back().about.text.toStdString(),
               "149900 more columns are not variables of the dictionary \"Survey\"");
     EXPECT_EQ(job.notes.said()[99].about.place->column, header.indexOf(",x2r,") + 2) << "places are those of the names";
+}
+
+TEST(JobNotes, DataWithoutARowHasNoMistake)
+{
+    for (const char *set : {R"("json": "none.json")", R"("values": [])", R"("csv": "none.csv")"}) {
+        TestJob job;
+        job.folder.put("none.json", " [ ] ");
+        job.folder.put("none.csv", "Number,Northing\n");
+        job.run(templateJob(QByteArray(R"("p": {)") + set + "}", tableStep, "\"strict\": true, "));
+        EXPECT_FALSE(job.error) << set << job.text().toStdString();
+        EXPECT_EQ(notesOf(job), "") << set;
+    }
+}
+
+TEST(JobNotes, ValuesHaveTheirPlaceInTheData)
+{
+    struct Row
+    {
+        const char *set;
+        const char *table;
+        const char *expected; ///< file, line and column of the first value that is missing
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {R"("csv": "p.csv")", "Points", "p.csv:4:3", "the empty cell"},
+        {R"("csv": "p.csv")", "Sorted", "p.csv:6:3", "of the first row in the order that is printed"},
+        {R"("csv": "p.csv", "skip": 1, "header": false, "order": "PN")", "Points", "p.csv:4:3", "without a header row"},
+        {R"("csv": "other.csv", "columns": {"Northing": "N"})", "Points", "other.csv:3:4", "a column that was chosen"},
+        {R"("json": "p.json")", "Points", "p.json:2:29", "a key without a value"},
+        {R"("json": "none.json")", "Points", "none.json:2:1", "a row without the key"},
+        {R"("values": [{"Number": 1, "Northing": 5}, {"Number": 2, "Northing": null}])", "Points", "job.json:1:#",
+         "in the job"},
+        {R"("sqlite": "points.db", "table": "points")", "Points", "points.db", "a database has no lines"},
+    };
+    for (const Row &row : rows) {
+        TestJob job;
+        job.folder.put("p.csv", "Number,Northing\n9,5\n8,5\n7,\n3,4\n1,\n");
+        job.folder.put("other.csv", "Number,N\n1,5\n\xC3\xA4x,\n");
+        job.folder.put("p.json", "[{\"Number\": 1, \"Northing\": 2},\n {\"Number\": 1, \"Northing\" : null}]");
+        job.folder.put("none.json", "{\"Number\": 1, \"Northing\": 2}\n{\"Number\": 1}\n");
+        geo::runSql(job.folder.path("points.db"),
+                    "CREATE TABLE points (Number TEXT, Northing REAL); INSERT INTO points VALUES (1, 5), (2, NULL)");
+        job.run(templateJob(QByteArray(R"("p": {)") + row.set + "}",
+                            QByteArray(R"({"table": ")") + row.table + R"(", "data": "p"})"));
+        ASSERT_FALSE(job.error) << row.reason << job.text().toStdString();
+        ASSERT_EQ(job.notes.said().size(), 1U) << row.reason << notesOf(job);
+        const kareport::JobNote note = job.notes.said().front();
+        QString place = note.dataFile.section(u'/', -1);
+        if (note.dataPlace) {
+            place += QStringLiteral(":%1:%2").arg(note.dataPlace->line).arg(note.dataPlace->column);
+        }
+        place.replace(QRegularExpression(QStringLiteral("job\\.json:1:\\d+")), QStringLiteral("job.json:1:#"));
+        EXPECT_EQ(place.toStdString(), row.expected) << row.reason;
+    }
+}
+
+TEST(JobNotes, APlaceIsFoundFarBehind)
+{
+    QByteArray csv = "Number,Northing\n";
+    for (int i = 0; i < 30'000; ++i) {
+        csv += QByteArray::number(i) + (i == 25'000 ? ",\n" : ",1\n");
+    }
+    TestJob job;
+    job.folder.put("p.csv", csv);
+    job.run(templateJob(R"("p": {"csv": "p.csv"})", tableStep));
+    ASSERT_EQ(job.notes.said().size(), 1U);
+    EXPECT_EQ(job.notes.said().front().firstRow, 25'001U);
+    ASSERT_TRUE(job.notes.said().front().dataPlace);
+    EXPECT_EQ(job.notes.said().front().dataPlace->line, 25'002);
+    EXPECT_EQ(job.notes.said().front().dataPlace->column, 7);
+}
+
+/// The processor's time for a job whose template has many variables and fields that no column fills.
+double timeOfNotes(int count)
+{
+    using namespace markup;
+    std::vector<QByteArray> fields;
+    std::vector<QByteArray> variables;
+    QByteArray header = "Number";
+    for (int i = 0; i < count; ++i) {
+        const QByteArray number = QByteArray::number(i);
+        fields.push_back(field(("Field" + number).constData(), "x", "5"));
+        fields.push_back(field(("Lost" + number).constData(), "x", "5"));
+        variables.push_back(variable(i + 2, ("Field" + number).constData(), "LENGTH"));
+        header += ",Column" + number;
+    }
+    variables.push_back(variable(1, "Number", "TEXT"));
+    TestJob job;
+    job.folder.put(
+        "t.xml",
+        element("ReportTemplate",
+                element("Name", "T") + element("Title", "t") +
+                    element("Tables", output("Table", "Points", "D", fields)) +
+                    element("Dictionaries", element("Dictionary", element("DictionaryName", "D") +
+                                                                      element("VariableList", joined(variables))))));
+    job.folder.put("p.csv", header + "\n");
+    QByteArray steps = tableStep;
+    for (int i = 0; i < count; ++i) {
+        steps += R"(, {"line": "x"})";
+    }
+    const std::clock_t before = std::clock();
+    job.run(templateJob(R"("p": {"csv": "p.csv"})", steps));
+    EXPECT_FALSE(job.error) << job.text().toStdString();
+    EXPECT_GE(job.notes.said().size(), static_cast<std::size_t>(2 * count));
+    return static_cast<double>(std::clock() - before) / CLOCKS_PER_SEC;
+}
+
+TEST(JobNotes, TakeTimeInProportion)
+{
+    const double few = timeOfNotes(400);
+    const double many = timeOfNotes(4000);
+    EXPECT_LT(many, 40 * few + 0.2) << "ten times as many: " << few << " s and " << many << " s";
+}
+
+/// The same for a job of many steps, each of which has something to note.
+double timeOfSteps(int count)
+{
+    TestJob job;
+    job.folder.put("p.csv", "Number,Northing\n1,\n");
+    QByteArray steps;
+    QByteArray sets;
+    for (int i = 0; i < count; ++i) {
+        const QByteArray name = QByteArray::number(i);
+        sets += QByteArray(i > 0 ? ", " : "") + "\"p" + name + R"(": {"csv": "p.csv"})";
+        steps += QByteArray(i > 0 ? ", " : "") + R"({"table": "Points", "data": "p)" + name + "\"}";
+    }
+    const std::clock_t before = std::clock();
+    job.run(templateJob(sets, steps));
+    EXPECT_FALSE(job.error) << job.text().toStdString();
+    EXPECT_EQ(job.notes.said().size(), static_cast<std::size_t>(count));
+    return static_cast<double>(std::clock() - before) / CLOCKS_PER_SEC;
+}
+
+TEST(JobNotes, OfManyStepsTakeTimeInProportion)
+{
+    const double few = timeOfSteps(300);
+    const double many = timeOfSteps(3000);
+    EXPECT_LT(many, 30 * few + 0.2) << "ten times as many: " << few << " s and " << many << " s";
 }
 
 TEST(JobNotes, AreErrorsInAStrictJob)

@@ -132,16 +132,15 @@ TEST(CommandLineCheck, ListsTheFieldsOfAJobWithTheirWidestValues)
                    .replace("\"csv\": \"points.csv\"", "\"csv\": \"points.csv\", \"units\": {\"length\": \"m\"}"));
     const ProgramRun run = folder.run("check job.json");
     EXPECT_EQ(run.status, 0) << run.all().constData();
-    EXPECT_EQ(
-        run.out.toStdString(),
-        "job.json:4:38: warning: 1 values are wider than the field \"Number\" of the table \"Points\", the first one in "
-        "row 2, line 5 of the report\n"
-        "job.json:4:38: warning: 1 values are wider than the field \"Northing\" of the table \"Points\", the first one "
-        "in row 3, line 6 of the report\n"
-        "job.json: table \"Points\", 3 rows of the data \"p\"\n"
-        "  field     label  width  widest  row              value\n"
-        "  Number    Pt         5       8    2  1 too wide  \"P1234567\"\n"
-        "  Northing  North      9      12    3  1 too wide  \"-1234567.800\"\n");
+    EXPECT_EQ(run.out.toStdString(),
+              "job.json:4:38: warning: 1 value is wider than the field \"Number\" of the table \"Points\", in "
+              "row 2, line 5 of the report\n"
+              "job.json:4:38: warning: 1 value is wider than the field \"Northing\" of the table \"Points\", "
+              "in row 3, line 6 of the report\n"
+              "job.json: table \"Points\", 3 rows of the data \"p\"\n"
+              "  field     label  width  widest  row              value\n"
+              "  Number    Pt         5       8    2  1 too wide  \"P1234567\"\n"
+              "  Northing  North      9      12    3  1 too wide  \"-1234567.800\"\n");
     EXPECT_EQ(run.err, "");
     EXPECT_EQ(folder.names(), (QStringList{"job.json", "points.csv", "t.xml"})) << "nothing is written";
 
@@ -195,7 +194,7 @@ TEST(CommandLineCheck, SaysWhatIsWrongWithAJobItsTemplateOrItsData)
         {"t.xml", "<Format>9.3</Format>", "<Format>9,3</Format>",
          "t.xml:6:65: warning: the format \"9,3\" counts as 9.0", 0, "a format of its template"},
         {"t.xml", "Site \xC3\xA4", "&amp;", "", 0, "another template of the file is not of the job"},
-        {"points.csv", "2A,0", "2A,", "job.json:4:38: warning: 1 values of the field \"Northing\"", 0, "a value"},
+        {"points.csv", "2A,0", "2A,", "job.json:4:38: warning: 1 value of the field \"Northing\"", 0, "a value"},
         {"job.json", "\"report\"", "\"output\": [{\"file\": \"points.csv\", \"as\": \"text\"}], \"report\"",
          "job.json:4:", 2, "an output that is the data"},
     };
