@@ -18,6 +18,7 @@
 
 #include <algorithm>
 #include <cstdio>
+#include <limits>
 
 namespace kareport
 {
@@ -29,6 +30,9 @@ QString tooLarge(const Output &output)
 {
     return Xlate("\"%1\" was not written: it would have more than %2").arg(output.file, sizeText(*output.mostBytes));
 }
+
+/// More characters than this are not worth a note each: there is no font for a whole script.
+constexpr std::size_t mostNotes = 100;
 
 /// Whether an output is a file, which is replaced in one step. Anything else cannot be taken back.
 bool isReplaced(const Output &output)
@@ -58,7 +62,16 @@ public:
         }
         const auto problem =
             replaceOutput(output_, [this](QIODevice &device, QString &wrong) { return writeTo(device, wrong); });
-        return {problem, false, warnings_};
+        return {problem, false, warnings_, notes_};
+    }
+
+    /// The notes on what would be written.
+    std::vector<JobNote> notes()
+    {
+        SizeLimit nowhere(nullptr, std::numeric_limits<qint64>::max());
+        QString problem;
+        writeTo(nowhere, problem);
+        return notes_;
     }
 
 private:
@@ -67,7 +80,7 @@ private:
         QFile file;
         QString problem;
         if (file.open(stdout, QIODevice::WriteOnly) && writeTo(file, problem) && file.flush()) {
-            return {std::nullopt, false, warnings_};
+            return {std::nullopt, false, warnings_, notes_};
         }
         if (isOutputReaderGone()) {
             return {std::nullopt, true, warnings_};
@@ -84,6 +97,7 @@ private:
         QString problem;
         const bool isExceeded = !writeTo(count, problem) && count.isExceeded();
         warnings_.clear(); // they come again
+        notes_.clear();
         return isExceeded;
     }
 
@@ -130,6 +144,15 @@ private:
         });
         problem = notes.problem;
         warnings_ += notes.warnings();
+        for (const MissingCharacter &missing : notes.missing) {
+            if (notes_.size() == mostNotes) {
+                break;
+            }
+            notes_.push_back({JobNote::Kind::UnshownCharacter,
+                              {output_.file, std::nullopt, PdfNotes::sentenceOf(missing)},
+                              missing.firstLine,
+                              static_cast<quint64>(missing.count)});
+        }
         return done;
     }
 
@@ -137,6 +160,7 @@ private:
     const Output &output_;
     Progress &progress_;
     QStringList warnings_;
+    std::vector<JobNote> notes_;
 };
 
 } // namespace
@@ -167,6 +191,12 @@ std::optional<QString> replaceOutput(const Output &output, const WriteContent &w
 OutputResult writeOutput(UReportDoc &report, const Output &output, Progress &progress)
 {
     return OutputWriting(report, output, progress).write();
+}
+
+std::vector<JobNote> unshownCharacters(UReportDoc &report, const Output &output, Progress &progress)
+{
+    return output.kind == OutputKind::Pdf && !makesNoPage(report) ? OutputWriting(report, output, progress).notes()
+                                                                  : std::vector<JobNote>();
 }
 
 const Output *streamedOutput(const Job &job)

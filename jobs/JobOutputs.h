@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Job.h"
+#include "JobNotes.h"
 #include "Progress.h"
 #include "UReportDoc.h"
 
@@ -20,12 +21,17 @@ struct OutputResult
     std::optional<QString> problem = std::nullopt; ///< a sentence that says what went wrong
     bool isReaderGone = false;                     ///< standard output has no reader any more: there is nothing to say
     QStringList warnings = {};                     ///< what a reader of the output should know
+    std::vector<JobNote> notes = {}; ///< the characters that it does not show; `warnings` names them as well
 
     bool isWritten() const { return !problem && !isReaderGone; }
 };
 
 /// Writes a report to where an output says. An empty report makes no report file.
 OutputResult writeOutput(UReportDoc &report, const Output &output, Progress &progress);
+
+/// The characters of a report that an output would not show: those that no font has for a PDF. All other kinds show every
+/// character.
+std::vector<JobNote> unshownCharacters(UReportDoc &report, const Output &output, Progress &progress);
 
 /// Writes the content of an output. @param problem  receives what went wrong, where the device does not know it
 /// @return whether all was written

@@ -171,16 +171,17 @@ std::optional<InputError> CommandLineJob::make(JobRunner &runner, UReportDoc &re
     }
     auto error = runner.run(report, stream);
     if (!isInterrupted() && !isReaderGone()) {
-        sayNotes(runner.notes(), error);
+        notes_ = runner.notes();
+        hasNotes_ = true;
+        sayNotes(error);
     }
     return error;
 }
 
-void CommandLineJob::sayNotes(const JobNotes &notes, const std::optional<InputError> &error)
+void CommandLineJob::sayNotes(const std::optional<InputError> &error)
 {
-    const bool isStrict = command_.strict || job_.strict;
-    for (const JobNote &note : notes.said()) {
-        const bool isError = isStrict && note.isMistake();
+    for (const JobNote &note : notes_.said()) {
+        const bool isError = isStrict() && note.isMistake();
         // One of the notes that are errors is the error that ends the job, which is said after them.
         const bool endsJob = isError && error && error->message() == note.about.message();
         if (!endsJob && (isError || !command_.quiet)) {
@@ -188,7 +189,19 @@ void CommandLineJob::sayNotes(const JobNotes &notes, const std::optional<InputEr
             printError(isError ? note.about.message() : note.message());
         }
     }
-    areNotesWritten_ = !command_.notes || writeNotesFile(notes, notesFile());
+}
+
+/// Says which characters an output would not show, where that is an error.
+ExitStatus CommandLineJob::checkCharacters(UReportDoc &report, Progress &progress)
+{
+    ExitStatus status = exitDone;
+    for (const Output &output : isStrict() ? job_.outputs : std::vector<Output>()) {
+        for (const JobNote &note : unshownCharacters(report, output, progress)) {
+            notes_.add(note);
+            status = fail(exitInput, note.about.message());
+        }
+    }
+    return status;
 }
 
 /// Writes the report directly into its output. @return nothing, and nothing made, when the output cannot be opened
@@ -242,15 +255,19 @@ ExitStatus CommandLineJob::run(Progress &progress)
     progress.finish();
     status_ = madeStatus(report, error);
     if (status_ == exitDone) {
-        status_ = writeOutputs(report, job_.outputs, progress, command_.quiet);
+        status_ = checkCharacters(report, progress);
+    }
+    if (status_ == exitDone) {
+        status_ = writeOutputs(report, job_.outputs, progress, command_.quiet, &notes_);
     }
     return status_ = withNotes(status_);
 }
 
-/// A status of a report that is good is that of its notes.
+/// Writes the file of the notes. A status of a report that is good is that of its notes.
 ExitStatus CommandLineJob::withNotes(ExitStatus status) const
 {
-    return status == exitDone && !areNotesWritten_ ? exitOutput : status;
+    const bool areWritten = !command_.notes || !hasNotes_ || writeNotesFile(notes_, notesFile());
+    return status == exitDone && !areWritten ? exitOutput : status;
 }
 
 } // namespace kareport

@@ -2,10 +2,13 @@
 
 #include "Commands.h"
 #include "Job.h"
+#include "JobNotes.h"
 #include "JobRunner.h"
 #include "JsonSource.h"
 #include "Progress.h"
 #include "UReportDoc.h"
+
+#include <optional>
 
 namespace kareport
 {
@@ -33,7 +36,9 @@ private:
     std::optional<ExitStatus> runIntoOutput(JobRunner &runner, UReportDoc &report, const Output &output,
                                             Progress &progress);
     std::optional<InputError> make(JobRunner &runner, UReportDoc &report, ReportTextWriter *stream);
-    void sayNotes(const JobNotes &notes, const std::optional<InputError> &error);
+    bool isStrict() const { return command_.strict || job_.strict; }
+    void sayNotes(const std::optional<InputError> &error);
+    ExitStatus checkCharacters(UReportDoc &report, Progress &progress);
     ExitStatus withNotes(ExitStatus status) const;
     QString notesFile() const;
     void takeOutputs(std::optional<OutputKind> kindOtherwise);
@@ -49,7 +54,8 @@ private:
     Job job_;
     std::optional<qint64> limit_; ///< bytes that neither the text nor an output may exceed
     ExitStatus status_ = exitDone;
-    bool areNotesWritten_ = true;
+    JobNotes notes_;        ///< on the report
+    bool hasNotes_ = false; ///< it came to them
 };
 
 } // namespace kareport

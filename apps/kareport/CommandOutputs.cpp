@@ -34,7 +34,8 @@ ExitStatus sayWritten(const Output &output, const OutputResult &result, bool isE
     return exitDone;
 }
 
-ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, Progress &progress, bool quiet)
+ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, Progress &progress, bool quiet,
+                        JobNotes *notes)
 {
     ExitStatus status = exitDone;
     for (const Output &output : outputs) {
@@ -63,6 +64,11 @@ ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, 
         }
         for (const QString &warning : quiet ? QStringList() : result.warnings) {
             printError(Xlate("kareport: warning: \"%1\": %2").arg(output.file, warning));
+        }
+        for (const JobNote &note : result.notes) {
+            if (notes != nullptr) {
+                notes->add(note);
+            }
         }
         status = std::max(status, sayWritten(output, result, report.IsEmpty(), quiet));
     }

@@ -13,6 +13,8 @@ ExitStatus sayWritten(const Output &output, const OutputResult &result, bool isE
 
 /// Writes a report to each of its outputs, and reports on standard error what goes wrong and, unless `quiet`, what a reader
 /// should know. An output that cannot be written does not keep the others from being written.
-ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, Progress &progress, bool quiet);
+/// @param notes  receive the characters that an output does not show; null where nobody asks
+ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, Progress &progress, bool quiet,
+                        JobNotes *notes = nullptr);
 
 } // namespace kareport

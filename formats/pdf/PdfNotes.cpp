@@ -29,6 +29,14 @@ QString pointsOf(const PdfWideLines &lines)
 
 } // namespace
 
+QString PdfNotes::sentenceOf(const MissingCharacter &missing)
+{
+    const QString code = QString::number(missing.character, 16).toUpper().rightJustified(4, u'0');
+    return Xlate("no font has the character \"%1\" (U+%2), first in line %3, %4 times in all")
+        .arg(QString::fromUcs4(&missing.character, 1), code, QString::number(missing.firstLine),
+             QString::number(missing.count));
+}
+
 QStringList PdfNotes::warnings() const
 {
     QStringList texts;
@@ -41,11 +49,7 @@ QStringList PdfNotes::warnings() const
                      .arg(linesOf(broken), pointsOf(broken));
     }
     for (std::size_t i = 0; i < std::min(missing.size(), mostWarnings); ++i) {
-        const MissingCharacter &entry = missing[i];
-        const QString code = QString::number(entry.character, 16).toUpper().rightJustified(4, u'0');
-        texts += Xlate("no font has the character \"%1\" (U+%2), first in line %3, %4 times in all")
-                     .arg(QString::fromUcs4(&entry.character, 1), code, QString::number(entry.firstLine),
-                          QString::number(entry.count));
+        texts += sentenceOf(missing[i]);
     }
     if (missing.size() > mostWarnings) {
         const qint64 others =

@@ -34,6 +34,8 @@ struct KAREPORT_EXPORT PdfNotes
     std::vector<MissingCharacter> missing; ///< in the order in which they occur; U+FFFD or "?" takes their place
     QString problem;                       ///< one sentence, when the PDF could not be made
 
+    /// A sentence about a missing character.
+    static QString sentenceOf(const MissingCharacter &missing);
     /// Sentences about wide lines and missing characters, for a person.
     QStringList warnings() const;
 };

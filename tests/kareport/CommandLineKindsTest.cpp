@@ -3,6 +3,10 @@
 
 #include <QFile>
 
+#include <QJsonArray>
+#include <QJsonDocument>
+#include <QJsonObject>
+
 #include <gtest/gtest.h>
 
 namespace
@@ -142,6 +146,34 @@ TEST(CommandLineKinds, AFontFileThatIsNotOneLeavesTheEarlierFile)
     EXPECT_EQ(broken.status, 3);
     EXPECT_TRUE(broken.err.contains("lucon.TTF\" cannot be used")) << broken.all().constData();
     EXPECT_EQ(folder.bytesOf("s.pdf"), "kept");
+}
+
+TEST(CommandLineKinds, CharactersThatAPdfCannotShowAreNotes)
+{
+    const CommandLineFolder folder;
+    const char *job = R"({"page": {"linesPerPage": 72, "charsPerRow": 80}, "header": false, "report": [{"line": "a"},
+        {"line": "\xF0\x9F\x98\x80 \xF0\x9F\x98\x80"}]})";
+    folder.put("smile.json", QByteArray(job).replace("\\xF0\\x9F\\x98\\x80", "\xF0\x9F\x98\x80"));
+    const ProgramRun run = folder.run("render smile.json -o a.txt -o a.pdf --notes notes.json");
+    EXPECT_EQ(run.status, 0) << run.all().constData();
+    EXPECT_EQ(run.err.count("no font has the character"), 1) << run.err.constData();
+    const QJsonArray notes = QJsonDocument::fromJson(folder.bytesOf("notes.json")).array();
+    ASSERT_EQ(notes.size(), 1) << folder.bytesOf("notes.json").constData();
+    const QJsonObject note = notes[0].toObject();
+    EXPECT_EQ(note[QStringLiteral("kind")].toString(), u"unshown-character");
+    EXPECT_EQ(note[QStringLiteral("file")].toString().section(u'/', -1), u"a.pdf");
+    EXPECT_EQ(note[QStringLiteral("count")].toInt(), 2);
+    EXPECT_EQ(note[QStringLiteral("reportLine")].toInt(), 2);
+    EXPECT_FALSE(note.contains(QStringLiteral("row"))) << "a report has no rows";
+    QFile::remove(folder.path("a.txt"));
+    QFile::remove(folder.path("a.pdf"));
+    const ProgramRun strict = folder.run("render smile.json -o a.txt -o a.pdf --strict --notes strict.json");
+    EXPECT_EQ(strict.status, 2) << strict.all().constData();
+    EXPECT_TRUE(strict.err.contains("a.pdf: error: no font has the character")) << strict.err.constData();
+    EXPECT_FALSE(QFile::exists(folder.path("a.txt"))) << "nothing is written, also not what comes before";
+    EXPECT_FALSE(QFile::exists(folder.path("a.pdf")));
+    EXPECT_EQ(folder.bytesOf("strict.json"), folder.bytesOf("notes.json"));
+    EXPECT_EQ(folder.run("render smile.json -o a.txt --strict").status, 0) << "a text shows all of them";
 }
 
 } // namespace
