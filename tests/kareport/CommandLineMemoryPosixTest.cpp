@@ -1,5 +1,6 @@
 #include "CommandLine.h"
 #include "GeoPackageFile.h"
+#include "PrivatePostgres.h"
 #include "TestSize.h"
 
 #include <sys/resource.h>
@@ -89,18 +90,15 @@ TEST(CommandLineMemory, WhereverItEndsTheProgramSaysSo)
     }
 }
 
-/// The peak of the program's memory for a job in a folder, in kilobytes; -1 when it fails.
-long peakOf(const QString &folder, const char *job, bool isCheck = false)
+/// The peak of the memory of a command of the shell in a folder, in kilobytes; -1 when it fails. "kareport" is the program.
+long peakOfCommand(const QString &folder, QByteArray command)
 {
-    const QByteArray program = KAREPORT_PROGRAM;
+    command.replace("kareport", KAREPORT_PROGRAM);
     const QByteArray path = folder.toUtf8();
     const pid_t child = fork();
     if (child == 0) {
         if (chdir(path.constData()) == 0) {
-            if (isCheck) {
-                execl(program.constData(), program.constData(), "check", job, "--quiet", nullptr);
-            }
-            execl(program.constData(), program.constData(), "render", job, "-o", "out.rep", "--quiet", nullptr);
+            execl("/bin/sh", "sh", "-c", command.constData(), nullptr);
         }
         _exit(127);
     }
@@ -108,6 +106,35 @@ long peakOf(const QString &folder, const char *job, bool isCheck = false)
     rusage usage = {};
     return wait4(child, &status, 0, &usage) == child && status == 0 ? usage.ru_maxrss : -1;
 }
+
+/// The same of the program for a job.
+long peakOf(const QString &folder, const char *job, bool isCheck = false)
+{
+    return peakOfCommand(folder, isCheck ? QByteArray("kareport check ") + job + " --quiet"
+                                         : QByteArray("kareport render ") + job + " -o out.rep --quiet");
+}
+
+/// A job that writes a data set through the table.
+QByteArray jobOf(const char *set)
+{
+    return QByteArray(R"({"page": {"linesPerPage": 72, "charsPerRow": 80},
+        "template": {"file": "t.xml", "name": "CONTROL"}, "report": [{"table": "Points", "data": "p"}],
+        "data": {"p": {)") +
+           set + "}}}";
+}
+
+QByteArray manyRows(int count)
+{
+    QByteArray csv = "Number,Northing\n";
+    for (int i = 0; i < count; ++i) {
+        csv += QByteArray::number(1'000'000'000 + i) + ",12345.678000000000000000000000000000\n";
+    }
+    return csv;
+}
+
+constexpr int fewRows = 40'000;
+constexpr int moreRows = 360'000;
+constexpr long mostKilobytes = 9 * 1024; // the piece that memory is given back in, and what it is read ahead by
 
 TEST(CommandLineMemory, DoesNotGrowWithTheRows)
 {
@@ -127,14 +154,12 @@ TEST(CommandLineMemory, DoesNotGrowWithTheRows)
     };
     const CommandLineFolder folder;
     const auto putData = [&folder](int count) {
-        QByteArray csv = "Number,Northing\n";
         QByteArray json;
         for (int i = 0; i < count; ++i) {
             const QByteArray number = QByteArray::number(1'000'000'000 + i);
-            csv += number + ",12345.678000000000000000000000000000\n";
             json += "{\"Number\":\"" + number + "\",\"Northing\":12345.678000000000000000}\n";
         }
-        folder.put("points.csv", csv);
+        folder.put("points.csv", manyRows(count));
         folder.put("points.json", json);
         QFile::remove(folder.path("points.db"));
         geo::runSql(
@@ -148,22 +173,86 @@ TEST(CommandLineMemory, DoesNotGrowWithTheRows)
         putData(count);
         std::vector<long> found;
         for (const Row &row : rows) {
-            folder.put("job.json", QByteArray(R"({"page": {"linesPerPage": 72, "charsPerRow": 80},
-                "template": {"file": "t.xml", "name": "CONTROL"}, "report": [{"table": "Points", "data": "p"}],
-                "data": {"p": {)") + row.set +
-                                       "}}}");
+            folder.put("job.json", jobOf(row.set));
             found.push_back(peakOf(folder.path(), "job.json"));
         }
         return found;
     };
     const std::vector<long> few = peaks(40'000);
     const std::vector<long> many = peaks(400'000); // files of 19 MB
-    constexpr long mostKilobytes = 9 * 1024; // the piece that memory is given back in, and what it is read ahead by
     for (std::size_t i = 0; i < std::size(rows); ++i) {
         ASSERT_GT(few[i], 0) << rows[i].reason;
         ASSERT_GT(many[i], 0) << rows[i].reason;
         EXPECT_LT(many[i] - few[i], mostKilobytes) << rows[i].reason << ": " << few[i] << " and " << many[i];
     }
+}
+
+TEST(CommandLineMemory, DoesNotGrowWithTheRowsOfAPipe)
+{
+#if defined(__SANITIZE_ADDRESS__)
+    GTEST_SKIP() << "the address sanitizer keeps what was freed";
+#endif
+    const CommandLineFolder folder;
+    for (const char *set : {R"("csv": "-")", R"("csv": "-", "encoding": "latin-1")"}) {
+        folder.put("job.json", jobOf(set));
+        const auto peak = [&folder](int rows) {
+            folder.put("points.csv", manyRows(rows));
+            return peakOfCommand(folder.path(), "cat points.csv | kareport render job.json -o out.rep --quiet");
+        };
+        const long few = peak(fewRows);
+        const long many = peak(fewRows + moreRows);
+        ASSERT_GT(few, 0) << set;
+        ASSERT_GT(many, 0) << set;
+        EXPECT_LT(many - few, mostKilobytes) << set << ": " << few << " and " << many;
+    }
+}
+
+TEST(CommandLineMemory, OfASortedTableIsThatOfItsKeysAndPlaces)
+{
+#if defined(__SANITIZE_ADDRESS__)
+    GTEST_SKIP() << "the address sanitizer keeps what was freed";
+#endif
+    const CommandLineFolder folder;
+    folder.put("t.xml",
+               controlTemplates().replace("<Sort></Sort>", "<Sort><VariableName>Number</VariableName></Sort>"));
+    constexpr long mostBytes = 260;           // a row, with a short text for its key
+    for (const bool isPipe : {false, true}) { // a pipe cannot be read twice: its rows go to a file
+        folder.put("job.json", jobOf(isPipe ? R"("csv": "-")" : R"("csv": "points.csv")"));
+        const auto peak = [&](int rows) {
+            folder.put("points.csv", manyRows(rows));
+            const QByteArray command = "kareport render job.json -o out.rep --quiet";
+            return peakOfCommand(folder.path(), isPipe ? "cat points.csv | " + command : command);
+        };
+        const long few = peak(fewRows);
+        const long many = peak(fewRows + moreRows);
+        ASSERT_GT(few, 0) << isPipe;
+        ASSERT_GT(many, 0) << isPipe;
+        EXPECT_LT(many - few, moreRows / 1024 * mostBytes + mostKilobytes) << isPipe << ": " << few << " and " << many;
+    }
+}
+
+TEST(CommandLineMemory, DoesNotGrowWithTheRowsOfAServer)
+{
+#if defined(__SANITIZE_ADDRESS__)
+    GTEST_SKIP() << "the address sanitizer keeps what was freed";
+#endif
+    const PrivatePostgres server;
+    if (!server.isRunning()) {
+        GTEST_SKIP() << "no server";
+    }
+    const CommandLineFolder folder;
+    const auto peak = [&](int rows) {
+        const QByteArray set = R"("postgresql": ")" + server.connection().toUtf8() +
+                               R"(", "query": "SELECT i AS number, i / 10.0 AS northing FROM generate_series(1, )" +
+                               QByteArray::number(rows) + R"() i")";
+        folder.put("job.json", jobOf(set.constData()));
+        return peakOf(folder.path(), "job.json");
+    };
+    const long few = peak(fewRows);
+    const long many = peak(fewRows + moreRows);
+    ASSERT_GT(few, 0);
+    ASSERT_GT(many, 0);
+    EXPECT_LT(many - few, mostKilobytes) << few << " and " << many;
 }
 
 TEST(CommandLineMemory, ACheckDoesNotGrowWithTheRows)
@@ -179,7 +268,6 @@ TEST(CommandLineMemory, ACheckDoesNotGrowWithTheRows)
                                    steps + "]}");
         return peakOf(folder.path(), "job.json", true);
     };
-    constexpr long mostKilobytes = 9 * 1024;
     for (const char *steps :
          {R"({"table": "Points", "data": "p"})", R"({"table": "Points", "data": "p"}, {"clear": true})"})
     {
