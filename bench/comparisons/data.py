@@ -127,7 +127,7 @@ def notes_share(surroundings, folder):
         count = int(match[1].replace(",", ""))
         if "PROGRAM TOTALS" in match[2]:
             total = count
-        elif re.search(r"JobSteps::note(Columns|SortKeys|Source|Values)\(|DataRemarks::\w+\(|addShown\(", match[2]):
+        elif re.search(r"JobSteps::note(Columns|SortKeys|Source|Values)\(|DataRemarks::\w+\(|addShown\(|addMissing\(", match[2]):
             notes += count
     return notes / total if total else None
 
