@@ -194,7 +194,7 @@ void ModelledReport::actAsHost(const ReportStep &step)
     case ReportOp::SaveAlone: saveAlone(); return;
     case ReportOp::SaveRichText: saveRichText(); return;
     case ReportOp::Open: openSaved(); break;
-    case ReportOp::ReloadRichText: reloadRichText(); break;
+    case ReportOp::ReloadRichText: reloadRichText(step); break;
     case ReportOp::OpenView:
         if (views_.size() < 3) {
             openView(step.b % 2 == 0);

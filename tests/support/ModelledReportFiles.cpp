@@ -143,7 +143,7 @@ void ModelledReport::openSaved()
     isModified_ = false;
 }
 
-void ModelledReport::reloadRichText()
+void ModelledReport::reloadRichText(const ReportStep &step)
 {
     constexpr qint64 longestLoaded = 8'000; // characters
     if (isRich_ || model_.size() == 0 || model_.size() > longestLoaded) {
@@ -163,6 +163,14 @@ void ModelledReport::reloadRichText()
         wrongSave_.prepend(QStringLiteral("loaded as rich text: "));
     }
     const int lines = report().GetLineCount();
+    Shown *shown = step.a % 2 != 0 ? visibleView(step.b) : nullptr;
+    if (shown != nullptr) {
+        model_.clear();
+        model_.countLinesOfFile(lines);
+        model_.setLinesPerPage(report().GetLinesPerPage());
+        typeIntoReloaded(*shown, step);
+        return;
+    }
     report().Clear();
     report().FixPage(9, 80);
     report().SetData(text);
@@ -171,6 +179,33 @@ void ModelledReport::reloadRichText()
     model_.setLinesPerPage(9);
     model_.setData(text);
     isModified_ = true;
+}
+
+void ModelledReport::typeIntoReloaded(Shown &shown, const ReportStep &step)
+{
+    kareport::ReportEdit &edit = shown.view->GetEdit();
+    const QString before = edit.windowText();
+    putCursor(edit, placeIn(edit.document()->characterCount(), step.c));
+    const bool endsLine = step.c % 2 != 0;
+    // In the text every line end before the cursor is one character more.
+    const QString typed = QString(before).insert(edit.textCursor().position() + edit.textCursor().blockNumber(),
+                                                 endsLine ? QStringLiteral("\r\n") : QStringLiteral("x"));
+    QTest::keyClick(&edit, endsLine ? Qt::Key_Return : Qt::Key_X);
+    // What was rich text is now the text that it shows, whose pages begin with its header lines.
+    model_.setData(typed);
+    isModified_ = true;
+    for (Shown &one : views_) {
+        one.isStale = false;
+        one.isEdited = false;
+    }
+    if (step.a % 4 == 1) {
+        EditSpy spy(edit);
+        edit.undo();
+        for (const SeenEdit &seen : spy.edits) {
+            model_.replace(seen.at, seen.removed, seen.inserted);
+        }
+        wrongAnswer_ = wrongAnswer_ || spy.edits.empty() || model_.text() != before;
+    }
 }
 
 QString ModelledReport::wrongWithRichText(const QString &before, const QStringList &pagesBefore)

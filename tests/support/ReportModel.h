@@ -52,6 +52,12 @@ public:
     void reload(const QString &text);
     /// Lines were counted that are no longer in the text.
     void countLines(int lines) { lineNumber_ += lines; }
+    /// A file has taken the place of the text, whose lines are those of its source.
+    void countLinesOfFile(int lines)
+    {
+        lineNumber_ += lines;
+        lineCount_ += lines;
+    }
     /// The view has put the same text with other line ends instead of this one.
     void withCrLf();
 
