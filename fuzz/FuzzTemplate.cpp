@@ -45,7 +45,7 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t *data, std::size_t size
     const kareport::TemplateFile file(bytes);
     if (size < 4096) {
         for (const auto *tag : {u"FIELD", u"TABLE", u"NAME"}) {
-            compareWithCutting(file.scanText(), tag);
+            compareWithCutting(scanTextOf(file), tag);
         }
     }
     kareport::checkTemplates(file);

@@ -5,6 +5,8 @@
 #include "Interrupt.h"
 #include "JobSteps.h"
 #include "LabelPlaceholders.h"
+#include "LeastSize.h"
+#include "ReportAccess.h"
 #include "ReportTextCodec.h"
 #include "TemplateSource.h"
 #include "Xlate.h"
@@ -34,6 +36,16 @@ QDateTime timeOf(const Job &job)
     return time ? *time : currentTime();
 }
 
+/// Lets the surroundings before a job hold again. The margins and the font size stay: the pages were made with them.
+void putBack(UReportDoc &report, std::optional<ReportSurroundings> before)
+{
+    if (before) {
+        before->margins = report.GetMargins();
+        before->fontSize = report.GetFontSize();
+    }
+    report.SetSurroundings(before);
+}
+
 } // namespace
 
 ReportSurroundings surroundingsOf(const Job &job)
@@ -55,23 +67,25 @@ ReportSurroundings surroundingsOf(const Job &job)
 std::optional<InputError> JobRunner::run(UReportDoc &report, ReportTextWriter *stream)
 {
     DataRemarks remarks;
-    ReportSurroundings surroundings = surroundingsOf(job_);
-    surroundings.remarks = &remarks;
+    const ReportSurroundings surroundings = surroundingsOf(job_);
     remarks.measures = isMeasuring_;
     placeholders_.reset();
     if (job_.options.placeholders) {
         placeholders_ = std::make_unique<Placeholders>(job_.settings, job_.application, surroundings.time, job_.title);
     }
-    surroundings.placeholders = placeholders_.get();
+    const auto restored = qScopeGuard([&report, before = report.GetSurroundings()] { putBack(report, before); });
     report.SetSurroundings(surroundings);
-    const auto restored = qScopeGuard([&report] { report.SetSurroundings(std::nullopt); });
+    const auto restoredHooks =
+        qScopeGuard([&report, before = ReportAccess::hooks(report)] { ReportAccess::setHooks(report, before); });
+    ReportAccess::setHooks(report, {placeholders_.get(), &remarks});
     if (auto error = prepare(report)) {
         return error;
     }
     report.StreamText(stream);
     const auto kept = qScopeGuard([&report] { report.StreamText(nullptr); });
-    const std::function<bool()> isStopped = [this, stream] {
-        return isInterrupted() || (stream != nullptr && stream->hasFailed()) || (isToStop_ && isToStop_());
+    const std::function<bool()> isStopped = [this, stream, &report] {
+        return isInterrupted() || (stream != nullptr && stream->hasFailed()) || isTooLarge(job_, leastSize(report)) ||
+               (isToStop_ && isToStop_());
     };
     JobData data(job_, source_, progress_, isStopped);
     notes_ = JobNotes();

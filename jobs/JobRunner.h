@@ -33,7 +33,7 @@ public:
         : job_(job), source_(source), progress_(progress)
     {}
 
-    /// Is asked now and then, besides the interrupts, whether the work is to stop.
+    /// Sets what is asked now and then, besides the interrupts, whether the work is to stop.
     void stopWhen(std::function<bool()> isToStop) { isToStop_ = std::move(isToStop); }
 
     /// Makes a note an error: the report is not made then, and the notes so far are kept.
@@ -45,7 +45,8 @@ public:
     /// The notes on the report that was made last, also on one that was not finished.
     const JobNotes &notes() const { return notes_; }
 
-    /// Writes the job's report. Its surroundings are the job's until it has been written; then the program's hold for it.
+    /// Writes the job's report. Its surroundings are the job's until it has been written; then those that it had hold again,
+    /// but for margins and font size. Making it stops when it is larger than an output of the job may be.
     /// @param report  a new one, which must stay open. In a program whose preferences must not matter it is made with
     ///                `surroundingsOf` the job
     /// @param stream  receives the text while it is written, where no step takes text back; null keeps it in the report.

@@ -38,7 +38,7 @@ std::optional<InputError> wrongLabelPlaceholder(const QString &path, const QStri
     if (!file) {
         return std::nullopt;
     }
-    const ScanText text = file->scanText();
+    const ScanText text = scanTextOf(*file);
     const auto element = findTemplate(text, name);
     if (!element) {
         return std::nullopt;

@@ -1,5 +1,8 @@
 #include "LeastSize.h"
 
+#include "UReportDoc.h"
+
+#include <algorithm>
 #include <optional>
 
 namespace kareport
@@ -142,6 +145,28 @@ qint64 leastSize(const Job &job)
         std::visit(count, step.action);
     }
     return count.bytes();
+}
+
+qint64 leastSize(const UReportDoc &report)
+{
+    return report.GetTextLength() / 2;
+}
+
+std::optional<qint64> sizeLimit(const Job &job)
+{
+    std::optional<qint64> limit;
+    for (const Output &output : job.outputs) {
+        if (output.mostBytes) {
+            limit = std::min(limit.value_or(*output.mostBytes), *output.mostBytes);
+        }
+    }
+    return limit;
+}
+
+bool isTooLarge(const Job &job, qint64 leastBytes)
+{
+    const auto limit = sizeLimit(job);
+    return limit && leastBytes > *limit;
 }
 
 } // namespace kareport

@@ -1,5 +1,7 @@
 #include "OutputKind.h"
 
+#include "FileKind.h"
+
 namespace kareport
 {
 
@@ -37,7 +39,7 @@ std::optional<OutputKind> outputKindOf(const QString &file, std::optional<Output
         return otherwise.value_or(OutputKind::Text);
     }
     for (const KindRow &row : kinds) {
-        if (!row.ending.isEmpty() && file.endsWith(row.ending, Qt::CaseInsensitive)) {
+        if (!row.ending.isEmpty() && hasEnding(file, row.ending)) {
             // Both kinds of rich text have one ending.
             const bool isImage = row.kind == OutputKind::RichText && otherwise == OutputKind::RichTextImage;
             return isImage ? *otherwise : row.kind;

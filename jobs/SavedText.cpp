@@ -2,14 +2,10 @@
 
 #include "LineEndings.h"
 #include "PageHeader.h"
-#include "ReportSaveName.h"
 #include "ReportTextDecoder.h"
 #include "RichTextReader.h"
 #include "UReportDoc.h"
 #include "Xlate.h"
-
-#include <QFile>
-#include <QFileInfo>
 
 namespace kareport
 {
@@ -51,15 +47,6 @@ Expected<SavedText> readRich(const QString &path, QByteArrayView bytes)
 }
 
 } // namespace
-
-bool isPdfFile(const QString &path)
-{
-    constexpr char firstBytes[] = "%PDF-";
-    constexpr qint64 length = sizeof firstBytes - 1;
-    QFile file(path);
-    return isPdfName(path) ||
-           (QFileInfo(path).isFile() && file.open(QIODevice::ReadOnly) && file.read(length) == firstBytes);
-}
 
 Expected<SavedText> readSavedText(const QString &path, QByteArrayView bytes)
 {

@@ -14,9 +14,6 @@ class UReportDoc;
 namespace kareport
 {
 
-/// Whether a file is a PDF, by its name or by its first bytes. Anything but a file is not opened.
-bool isPdfFile(const QString &path);
-
 /// The content of a saved report.
 struct SavedText
 {

@@ -28,7 +28,7 @@ FormatWidths::FormatWidths(const QString &path, const QString &name)
     if (!file) {
         return;
     }
-    const ScanText text = file->scanText();
+    const ScanText text = scanTextOf(*file);
     const auto chosen = findTemplate(text, name);
     if (!chosen) {
         return;

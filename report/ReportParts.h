@@ -2,6 +2,7 @@
 
 #include "PageLayout.h"
 #include "PageWriter.h"
+#include "ReportAccess.h"
 #include "ReportSurroundings.h"
 #include "ReportTemplate.h"
 #include "TextMirrors.h"
@@ -29,6 +30,7 @@ struct ReportParts
     }
 
     std::optional<ReportSurroundings> surroundings; ///< nothing while those of the program hold
+    ReportHooks hooks;
 
     // Text and pages
     TextMirrors mirrors;

@@ -1,7 +1,6 @@
 #include "UReportDoc.h"
 
 #include "LeadingInteger.h"
-#include "Placeholders.h"
 #include "Profile.h"
 #include "ReportExit.h"
 #include "ReportParts.h"
@@ -80,17 +79,13 @@ void UReportDoc::SetSurroundings(const std::optional<kareport::ReportSurrounding
 {
     parts_->surroundings = surroundings;
     parts_->data.ownPrintHash = surroundings ? std::optional(surroundings->printHash) : std::nullopt;
-    parts_->data.remarks = surroundings ? surroundings->remarks : nullptr;
-    const kareport::Placeholders *placeholders = surroundings ? surroundings->placeholders : nullptr;
-    parts_->page.setPageMarks(placeholders != nullptr);
-    parts_->data.labelText = nullptr;
-    if (placeholders != nullptr) {
-        parts_->data.labelText = [placeholders](const QString &label, const QString &title) {
-            return placeholders->labelOf(label, title);
-        };
-    }
     if (surroundings) {
         parts_->layout.margins = surroundings->margins;
         parts_->layout.fontSize = surroundings->fontSize;
     }
+}
+
+const std::optional<kareport::ReportSurroundings> &UReportDoc::GetSurroundings() const
+{
+    return parts_->surroundings;
 }

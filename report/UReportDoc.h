@@ -27,8 +27,8 @@ namespace kareport
 class ReportTextWriter;
 class ReportWindow;
 enum class LineEnds;
-struct LoadedText;
 struct PdfNotes;
+struct ReportAccess;
 struct ReportPage;
 struct ReportParts;
 struct ReportSurroundings;
@@ -63,6 +63,13 @@ public:
     /// Always false.
     bool IsThatDocId(const QString &) const;
 
+    /// Lets what is given hold for the report instead of the application's name, its clock, the default printer, the
+    /// user's preferences and the setting for wide values; margins and font size are taken over. Nothing lets the program's
+    /// own hold again: margins and font size then stay. Neither measures the page.
+    void SetSurroundings(const std::optional<kareport::ReportSurroundings> &surroundings);
+    /// What holds for the report instead; nothing while the program's own hold.
+    const std::optional<kareport::ReportSurroundings> &GetSurroundings() const;
+
     // --- Text: UReportDocText.cpp -----------------------------------------------------------------------------------
 
     /// The report text, lines ended by CR LF, followed by a 0; valid until the next write. A text without a character above
@@ -84,11 +91,6 @@ public:
     /// Replaces the text as it is. Counters stay, so what is written next continues the old pages. Where its pages begin is
     /// found by its page headers. Without memory for it the text is empty, and lost.
     void SetData(const QString &text);
-    /// Takes over a text that was made elsewhere, as on another thread, in a time that does not grow with it. Its lines are
-    /// counted as if they had been written, and its pages begin where it says. Neither rich text nor a report window is notified
-    /// of it. Its type is not among the installed headers: it serves the programs of this project.
-    /// @param text  is handed the text before it
-    void TakeText(kareport::LoadedText &text);
     /// Replaces a piece of the text as it is, in a time that does not grow with the text. Counters stay; pages begin where
     /// they did before.
     /// @param at  the first character replaced, from 0
@@ -179,7 +181,7 @@ public:
     /// Whether the text is the source of a rich-text document, which is shown in its place.
     bool HoldsRichTextSource() const;
     /// The pages of the report, for all that shows, prints or saves them. Of a report that holds the source of a rich-text
-    /// document they are those of the text that is shown, as `kareport::shownPlainText` gives it.
+    /// document they are those of the text that its view shows.
     std::vector<kareport::ReportPage> GetPages() const;
     /// Where pages begin, as the writer recorded it: the places of characters in the text, from 0, in ascending order. A
     /// place that is not at the beginning of a line counts for nothing.
@@ -211,10 +213,6 @@ public:
     void LoadSettings();
     /// Writes the margins to the user's preferences.
     void SaveSettings();
-    /// Lets what is given hold for the report instead of the application's name, its clock, the default printer, the
-    /// user's preferences and the setting for wide values; margins and font size are taken over. Nothing lets the program's
-    /// own hold again: margins and font size then stay. Neither measures the page.
-    void SetSurroundings(const std::optional<kareport::ReportSurroundings> &surroundings);
 
     // --- Templates and data: UReportDocTemplate.cpp -----------------------------------------------------------------
 
@@ -425,6 +423,8 @@ public:
     bool EnableCloseOption() const;
 
 private:
+    friend struct kareport::ReportAccess;
+
     void enter();
     bool loadTemplate(const QStringList &paths, const QString &templateName, const QString &tableName,
                       const QString &blockName);

@@ -78,13 +78,6 @@ void UReportDoc::SetData(const QString &text)
     FindPageStarts();
 }
 
-void UReportDoc::TakeText(kareport::LoadedText &text)
-{
-    ++parts_->editCount;
-    parts_->page.exchangeText(text.text, std::move(text.pageStarts), text.lineEnds);
-    SetModifiedFlag(true);
-}
-
 bool UReportDoc::ReplaceText(qint64 at, qint64 removed, QStringView inserted)
 {
     if (!parts_->page.replace(at, removed, inserted)) {

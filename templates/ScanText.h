@@ -8,6 +8,8 @@
 namespace kareport
 {
 
+class TemplateFile;
+
 /// A piece of template text that remembers where each of its characters was in the file, through every cut, so that
 /// a remark about it can name line and column.
 class ScanText
@@ -46,5 +48,9 @@ private:
     QString text_;
     std::vector<Run> runs_;
 };
+
+/// The text of a template file that is scanned: without tabs, line feeds and carriage returns, which also values lose.
+/// @throws std::bad_alloc
+ScanText scanTextOf(const TemplateFile &file);
 
 } // namespace kareport

@@ -14,7 +14,7 @@ namespace
 std::optional<TemplateRemark> firstUnread(const TemplateFile &file)
 {
     ScanNotes notes;
-    readTemplateElements(file.scanText(), &notes);
+    readTemplateElements(scanTextOf(file), &notes);
     for (const ScanNote &note : notes) {
         if (note.tag == u"REPORTTEMPLATE" && isScanError(note)) {
             return TemplateRemark{TextPlaces(file.text()).of(note.source), true, scanNoteText(note)};

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
 #include "TemplateFile.h"
 #include "TextPlace.h"
 
@@ -33,11 +32,10 @@ struct TemplateCheckScope
 
 /// Reads every template of a file as the module reads it and says what the module passes over in silence, in the order
 /// of the file. Where memory ends, the one remark is an error that says so.
-KAREPORT_EXPORT std::vector<TemplateRemark> checkTemplates(const TemplateFile &file,
-                                                           const TemplateCheckScope &scope = {});
+std::vector<TemplateRemark> checkTemplates(const TemplateFile &file, const TemplateCheckScope &scope = {});
 
 /// The first thing in a file that keeps a whole template from being read; nothing when there is none. That memory has ended
 /// while it was looked for is one.
-KAREPORT_EXPORT std::optional<TemplateRemark> firstUnreadTemplate(const TemplateFile &file);
+std::optional<TemplateRemark> firstUnreadTemplate(const TemplateFile &file);
 
 } // namespace kareport

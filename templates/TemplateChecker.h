@@ -41,7 +41,7 @@ class TemplateChecker
 {
 public:
     TemplateChecker(const TemplateFile &file, const TemplateCheckScope &scope)
-        : text_(file.text()), places_(text_), scan_(file.scanText()), scope_(scope)
+        : text_(file.text()), places_(text_), scan_(scanTextOf(file)), scope_(scope)
     {}
 
     std::vector<TemplateRemark> check();

@@ -120,10 +120,10 @@ std::optional<QString> TemplateFile::readScanned(const QString &path)
     });
 }
 
-ScanText TemplateFile::scanText() const
+ScanText scanTextOf(const TemplateFile &file)
 {
     ScanText scanned;
-    const QStringView view(text_);
+    const QStringView view(file.text());
     const auto *const begin = view.begin();
     for (const auto *at = begin; at != view.end();) {
         const auto *const end = std::find_if(at, view.end(), isStripped);

@@ -11,8 +11,6 @@
 namespace kareport
 {
 
-class ScanText;
-
 /// The text of a template file: UTF-8 when the whole file is valid UTF-8, else Latin-1. The file counts as read in
 /// chunks of 4095 bytes, and a zero byte ends its chunk's text.
 class KAREPORT_EXPORT TemplateFile
@@ -28,9 +26,6 @@ public:
 
     /// The text as it is in the file.
     const QString &text() const { return text_; }
-    /// The text that is scanned: without tabs, line feeds and carriage returns, which also values lose.
-    /// @throws std::bad_alloc
-    ScanText scanText() const;
 
 private:
     QString text_;

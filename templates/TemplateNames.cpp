@@ -8,7 +8,7 @@ namespace kareport
 std::vector<sXmlReportTemplateInfo> templateInfos(const TemplateFile &file)
 {
     std::vector<sXmlReportTemplateInfo> infos;
-    for (const TemplateElement &element : readTemplateElements(file.scanText())) {
+    for (const TemplateElement &element : readTemplateElements(scanTextOf(file))) {
         infos.push_back({element.name.value.text(), element.title.value.text()});
     }
     return infos;

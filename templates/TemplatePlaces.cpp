@@ -52,7 +52,7 @@ private:
 
 VariablePlaces::VariablePlaces(const TemplateFile &file, const QString &templateName)
 {
-    const ScanText text = file.scanText();
+    const ScanText text = scanTextOf(file);
     const auto chosen = findTemplate(text, templateName);
     if (!chosen) {
         return;

@@ -1,6 +1,5 @@
 #pragma once
 
-#include "KaReportExport.h"
 #include "TemplateFile.h"
 #include "TextPlace.h"
 
@@ -21,7 +20,7 @@ enum class TemplatePart
 };
 
 /// Where a template of a file names variables: for the first time in a table, in a block or among the sort keys of a table.
-class KAREPORT_EXPORT VariablePlaces
+class VariablePlaces
 {
 public:
     /// Reads the template. @param templateName  without regard to case; of several templates of the name the last one, as for

@@ -47,6 +47,7 @@ DeskFrame::DeskFrame() : files_([this](const QString &path) { fileChanged(path);
     UpdateCommands();
     constexpr int unseenInterval = 500; // milliseconds
     auto *unseenTimer = new QTimer(this);
+    unseenTimer->setObjectName(unseenTimerName);
     connect(unseenTimer, &QTimer::timeout, this, [this] { closeUnseen(); });
     unseenTimer->start(unseenInterval);
     constexpr int recoveryInterval = 5000; // milliseconds

@@ -6,6 +6,8 @@
 #include "UDocument.h"
 #include "UXTPMDIFrameWnd.h"
 
+#include <QLatin1StringView>
+
 #include <functional>
 #include <optional>
 
@@ -23,6 +25,9 @@ struct TemplateJob;
 class DeskFrame : public UXTPMDIFrameWnd
 {
 public:
+    /// The timer that looks for reports that no window shows any more; each of its timeouts is a look.
+    static constexpr QLatin1StringView unseenTimerName{"unseen"};
+
     DeskFrame();
     ~DeskFrame() override;
 

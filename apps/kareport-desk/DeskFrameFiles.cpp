@@ -1,6 +1,7 @@
 #include "DeskFrame.h"
 
 #include "AppMessageBox.h"
+#include "FileKind.h"
 #include "JobLauncher.h"
 #include "ReportSaveName.h"
 #include "SavedReports.h"
@@ -96,11 +97,12 @@ bool DeskFrame::OpenFile(const QString &path)
             {reason, QFileInfo(path).fileName(), MessageButtons::Ok, kareport::MessageIcon::Information});
         return false;
     }
-    if (path.endsWith(u".xml", Qt::CaseInsensitive)) {
+    const auto kind = kareport::fileKindOf(path);
+    if (kind == kareport::FileKind::Template) {
         fromTemplate(path);
         return true;
     }
-    if (path.endsWith(u".json", Qt::CaseInsensitive)) {
+    if (kind == kareport::FileKind::Job) {
         return openJob(path);
     }
     const QString file = QDir::cleanPath(QFileInfo(path).absoluteFilePath());

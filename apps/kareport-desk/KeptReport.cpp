@@ -2,6 +2,7 @@
 
 #include "MemoryLasts.h"
 #include "RecoveryFolder.h"
+#include "ReportAccess.h"
 #include "ReportEntry.h"
 #include "ReportPages.h"
 #include "ReportSaveName.h"
@@ -45,7 +46,7 @@ TextFile readText(const KeptReport &kept)
 /// Gives a report the text that was kept of it. @return whether it has all of it
 bool fill(UReportDoc &report, const KeptReport &kept, LoadedText &text)
 {
-    report.TakeText(text);
+    ReportAccess::takeText(report, text);
     fixPage(report, kept);
     if (!kept.path.isEmpty() && !isPdfName(kept.path)) {
         report.SetPathName(kept.path, false);

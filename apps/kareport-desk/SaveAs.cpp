@@ -2,6 +2,7 @@
 
 #include "AppMessageBox.h"
 #include "FileIdentity.h"
+#include "FileKind.h"
 #include "Folders.h"
 #include "JobOutputs.h"
 #include "PdfExport.h"
@@ -112,7 +113,7 @@ void exportPdf(const UReportDoc &report, const QString &path)
 QString withEndingOf(const QString &path, const QString &kind, const QStringList &kinds)
 {
     const bool isKnown = std::any_of(kinds.begin(), kinds.end(), [&path](const QString &known) {
-        return known.startsWith(u"*.") && path.endsWith(QStringView(known).sliced(1), Qt::CaseInsensitive);
+        return known.startsWith(u"*.") && hasEnding(path, QStringView(known).sliced(1));
     });
     return isKnown || !kind.startsWith(u"*.") ? path : path + kind.sliced(path.endsWith(u'.') ? 2 : 1);
 }

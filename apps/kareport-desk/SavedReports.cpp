@@ -1,9 +1,11 @@
 #include "SavedReports.h"
 
+#include "FileKind.h"
 #include "InputError.h"
 #include "LineEndings.h"
 #include "LoadedText.h"
 #include "MemoryLasts.h"
+#include "ReportAccess.h"
 #include "ReportContent.h"
 #include "ReportEntry.h"
 #include "RichTextReader.h"
@@ -31,7 +33,7 @@ namespace
 /// nothing: without a view that could write that, the report text is saved under it.
 TextFile readReportFile(const QString &path, UserInput input)
 {
-    const bool mayBeRichText = path.endsWith(u".rtf", Qt::CaseInsensitive);
+    const bool mayBeRichText = fileKindOf(path) == FileKind::RichText;
     return readTextFile(path, input, [mayBeRichText](QByteArrayView bytes, LoadedText &loaded, const auto &proceed) {
         return mayBeRichText && !richTextIn(bytes).isEmpty() ? TextLoading::OtherText
                                                              : loadReportText(bytes, loaded, proceed);
@@ -60,7 +62,7 @@ std::optional<QString> readOther(const QString &path, OtherText &other)
     other.isFromRtf = read.IsOpenedFromRtf();
     other.text.pageStarts = read.GetPageStarts();
     other.text.lineEnds = read.GetLineCount();
-    read.TakeText(other.text);
+    ReportAccess::takeText(read, other.text);
     return std::nullopt;
 }
 
@@ -70,12 +72,12 @@ std::optional<QString> readOther(const QString &path, OtherText &other)
 QStringList keepPageLength(UReportDoc &report)
 {
     QTextDocument shown;
-    RichTextNotes passedOver;
-    const auto wrong = showReportContent(report, shown, &passedOver);
+    RichTextNotes notShown;
+    const auto wrong = showReportContent(report, shown, &notShown);
     if (const auto lines = linesOfPages(withCrLf(shown.toPlainText()))) {
         report.FixPage(lines, std::nullopt);
     }
-    QStringList warnings = passedOver.texts();
+    QStringList warnings = notShown.texts();
     if (wrong) {
         warnings.append(InputError{QFileInfo(report.GetPathName()).fileName(), wrong->place, wrong->text}.message());
     }
@@ -98,7 +100,7 @@ void put(UReportDoc &report, LoadedText &loaded, bool isFromRtf)
         writeLines(report, copy);
         report.FindPageStarts();
     } else {
-        report.TakeText(loaded);
+        ReportAccess::takeText(report, loaded);
     }
 }
 

@@ -3,14 +3,13 @@
 #include "CheckOutput.h"
 #include "CommandSetup.h"
 #include "FileIdentity.h"
+#include "FileKind.h"
 #include "Interrupt.h"
 #include "JobCheck.h"
 #include "NotesFile.h"
 #include "TerminalProgress.h"
 #include "Xlate.h"
 
-#include <QFile>
-#include <QFileInfo>
 #include <QHash>
 #include <QJsonArray>
 #include <QJsonDocument>
@@ -24,21 +23,6 @@ namespace kareport
 
 namespace
 {
-
-/// Whether a file is a job. A name that does not tell is looked into: a job begins with a brace.
-bool isJobFile(const QString &file)
-{
-    if (file == u"-" || file.endsWith(u".json", Qt::CaseInsensitive)) {
-        return true;
-    }
-    QFile opened(file);
-    if (file.endsWith(u".xml", Qt::CaseInsensitive) || !QFileInfo(file).isFile() || !opened.open(QIODevice::ReadOnly)) {
-        return false;
-    }
-    constexpr qint64 lookedAt = 4096;
-    const QByteArray begin = opened.read(lookedAt).trimmed();
-    return begin.startsWith('{');
-}
 
 CheckedFile noMemoryFor(const QString &file)
 {
@@ -89,12 +73,19 @@ std::optional<QString> notesClash(const CheckCommand &command, const QStringList
     return std::nullopt;
 }
 
-CheckedFile checkFile(const CheckCommand &command, const QString &file, bool isJob, Progress &progress)
+/// @param wrongSet  receives what is wrong with a key that the command line sets; the job is not checked then
+CheckedFile checkFile(const CheckCommand &command, const QString &file, bool isJob, Progress &progress,
+                      std::optional<QString> &wrongSet)
 {
     try {
-        return isJob ? checkJob(file, JsonSource::read(file), command.sets, command.strict, notesFileOf(command, file),
-                                progress)
-                     : checkTemplateFile(file);
+        if (!isJob) {
+            return checkTemplateFile(file);
+        }
+        auto source = JsonSource::read(file);
+        if (auto *json = std::get_if<JsonSource>(&source)) {
+            wrongSet = applySets(*json, command.sets);
+        }
+        return wrongSet ? CheckedFile() : checkJob(file, source, command.strict, notesFileOf(command, file), progress);
     } catch (const std::bad_alloc &) {
         return noMemoryFor(file);
     }
@@ -131,9 +122,10 @@ ExitStatus CheckCommand::run(int &argc, char **argv) const
     ExitStatus status = exitDone;
     QJsonArray all;
     for (const QString &file : files) {
-        const CheckedFile checked = checkFile(*this, file, jobs.contains(file), bar);
-        if (checked.wrongSet) {
-            return usageExit(*checked.wrongSet);
+        std::optional<QString> wrongSet;
+        const CheckedFile checked = checkFile(*this, file, jobs.contains(file), bar, wrongSet);
+        if (wrongSet) {
+            return usageExit(*wrongSet);
         }
         if (checked.isStopped || isInterrupted()) {
             printError(Xlate("kareport: stopped; nothing more was checked"));

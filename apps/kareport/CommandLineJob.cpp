@@ -28,8 +28,7 @@ constexpr qint64 largeReport = qint64(100) << 20;
 
 } // namespace
 
-CommandLineJob::CommandLineJob(const RenderCommand &command, Expected<JsonSource> source)
-    : command_(command), limit_(command.limit ? sizeFromText(*command.limit) : std::nullopt)
+CommandLineJob::CommandLineJob(const RenderCommand &command, Expected<JsonSource> source) : command_(command)
 {
     if (const InputError *error = errorOf(source)) {
         fail(exitInput, error->message());
@@ -62,8 +61,9 @@ void CommandLineJob::takeOutputs(std::optional<OutputKind> kindOtherwise)
     } else if (job_.outputs.empty()) {
         job_.outputs.push_back({QStringLiteral("-"), *outputKindOf(QStringLiteral("-"), kindOtherwise)});
     }
+    const auto limit = command_.limit ? sizeFromText(*command_.limit) : std::nullopt;
     for (Output &output : job_.outputs) {
-        output.mostBytes = limit_;
+        output.mostBytes = limit;
     }
 }
 
@@ -99,7 +99,7 @@ void CommandLineJob::checkOutputs()
 ExitStatus CommandLineJob::checkSize()
 {
     const qint64 least = leastSize(job_);
-    if (limit_ && least > *limit_) {
+    if (isTooLarge(job_, least)) {
         return failTooLarge(least);
     }
     if (least >= largeReport && !command_.quiet) {
@@ -112,13 +112,7 @@ ExitStatus CommandLineJob::failTooLarge(qint64 bytes)
 {
     return fail(exitOutput,
                 Xlate("kareport: nothing was written: the report has at least %1, more than the limit of %2")
-                    .arg(sizeText(bytes), sizeText(*limit_)));
-}
-
-/// Whether the text exceeds the limit also when every second character is one that plain text does without.
-bool CommandLineJob::isTooLarge(const UReportDoc &report) const
-{
-    return limit_ && report.GetTextLength() / 2 > *limit_;
+                    .arg(sizeText(bytes), sizeText(*sizeLimit(job_))));
 }
 
 bool CommandLineJob::isReaderGone() const
@@ -157,8 +151,8 @@ ExitStatus CommandLineJob::madeStatus(const UReportDoc &report, const std::optio
         endByClosedReader();
         return exitOutput;
     }
-    if (isTooLarge(report)) {
-        return failTooLarge(report.GetTextLength() / 2);
+    if (isTooLarge(job_, leastSize(report))) {
+        return failTooLarge(leastSize(report));
     }
     return error ? fail(exitInput, error->message()) : exitDone;
 }
@@ -245,7 +239,7 @@ ExitStatus CommandLineJob::run(Progress &progress)
     // It is not a user's report: neither the user's preferences nor a printer are asked for it.
     UReportDoc report(surroundingsOf(job_));
     JobRunner runner(job_, source_, progress);
-    runner.stopWhen([&] { return isReaderGone() || isTooLarge(report); });
+    runner.stopWhen([this] { return isReaderGone(); });
     if (const Output *output = streamedOutput(job_)) {
         if (const auto status = runIntoOutput(runner, report, *output, progress)) {
             return status_ = withNotes(*status);

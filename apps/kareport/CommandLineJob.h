@@ -44,7 +44,6 @@ private:
     void takeOutputs(std::optional<OutputKind> kindOtherwise);
     void checkOutputs();
     ExitStatus checkSize();
-    bool isTooLarge(const UReportDoc &report) const;
     bool isReaderGone() const;
     ExitStatus failTooLarge(qint64 bytes);
     ExitStatus fail(ExitStatus status, const QString &message);
@@ -52,7 +51,6 @@ private:
     const RenderCommand &command_;
     JsonSource source_;
     Job job_;
-    std::optional<qint64> limit_; ///< bytes that neither the text nor an output may exceed
     ExitStatus status_ = exitDone;
     JobNotes notes_;        ///< on the report
     bool hasNotes_ = false; ///< it came to them

@@ -1,6 +1,6 @@
 #include "Commands.h"
 
-#include "SavedText.h"
+#include "FileKind.h"
 #include "Xlate.h"
 
 #include <QCoreApplication>

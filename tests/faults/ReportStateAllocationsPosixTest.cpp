@@ -1,6 +1,7 @@
 #include "ReportAllocations.h"
 
 #include "CViewPane.h"
+#include "ReportAccess.h"
 #include "UArchive.h"
 #include "UJobSettings.h"
 
@@ -17,9 +18,9 @@ const QString longName = QStringLiteral("a name that is long enough to need memo
 const UJobSettings jobSettings = UJobSettings();
 
 constexpr ReportOperation operations[] = {
-    {"TakeText", Text::Set,
+    {"takeText", Text::Set,
      [](auto &s, auto &) {
-         s.report.TakeText(s.loaded);
+         kareport::ReportAccess::takeText(s.report, s.loaded);
          return lostNothing(s);
      }},
     {"Clear", Text::Set,

@@ -229,7 +229,7 @@ TEST_F(TemplateAllocations, AFileIsReadWholeOrNotAtAll)
                       hasFailed = failing.hasFailed();
                   }
                   EXPECT_TRUE(!file || file->text() == whole->text()) << number;
-                  EXPECT_TRUE(!scanned || *scanned == whole->scanText().text()) << number;
+                  EXPECT_TRUE(!scanned || *scanned == scanTextOf(*whole).text()) << number;
                   EXPECT_EQ(file && scanned, !hasFailed) << number;
                   return hasFailed && !testing::Test::HasFailure();
               }),

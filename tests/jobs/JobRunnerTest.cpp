@@ -213,7 +213,39 @@ TEST(JobRunner, TheProgramAroundAJobStaysAsItIs)
     report.SetHeader();
     report.Clear();
     report.NewPage(-1);
-    EXPECT_TRUE(textOf(report).startsWith(QStringLiteral("TALVEN - "))) << "what comes later is the program's again";
+    EXPECT_TRUE(textOf(report).startsWith(QStringLiteral("TALVEN Job - "))) << "what it was made with holds on";
+}
+
+TEST(JobRunner, WhatHeldForTheReportBeforeTheJobHoldsAgain)
+{
+    const FixedSurroundings program;
+    const auto source = jobtext::sourceOf(R"({"application": "TALVEN Job", "now": "1999-12-31T23:59:00",
+        "page": {"linesPerPage": 72, "charsPerRow": 80, "margins": [1, 2, 3, 4], "fontSize": 13},
+        "options": {"placeholders": true}, "report": [{"line": "{application}"}]})");
+    const auto job = kareport::readJob(source);
+    ASSERT_EQ(kareport::errorOf(job), nullptr);
+    kareport::Progress progress(false);
+    kareport::JobRunner runner(std::get<kareport::Job>(job), source, progress);
+    const auto firstLine = [&runner](UReportDoc &report) {
+        EXPECT_FALSE(runner.run(report));
+        EXPECT_TRUE(textOf(report).contains(QStringLiteral("\r\nTALVEN Job\r\n"))) << textOf(report).toStdString();
+        report.Clear();
+        report.SetHeader();
+        report.WriteLine(QStringLiteral("{application}"), -1, 1, 0);
+        EXPECT_TRUE(textOf(report).contains(QStringLiteral("\r\n{application}\r\n"))) << "no placeholder any more";
+        return textOf(report).section(QStringLiteral(" - "), 0, 0);
+    };
+
+    UReportDoc programs;
+    EXPECT_EQ(firstLine(programs), QStringLiteral("TALVEN")) << "the program's own";
+    EXPECT_FALSE(programs.GetSurroundings());
+
+    kareport::ReportSurroundings surroundings;
+    surroundings.application = QStringLiteral("TALVEN Host");
+    UReportDoc hosts(surroundings);
+    EXPECT_EQ(firstLine(hosts), QStringLiteral("TALVEN Host"));
+    EXPECT_EQ(hosts.GetMargins(), QMargins(1, 2, 3, 4)) << "its pages were made with them";
+    EXPECT_EQ(hosts.GetFontSize(), 13U);
 }
 
 TEST(JobRunner, AReportOfAProgramWithPreferencesIsMadeAsTheJobSays)

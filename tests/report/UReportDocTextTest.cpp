@@ -3,6 +3,7 @@
 #include "LoadedText.h"
 #include "PageMeasurement.h"
 #include "Preferences.h"
+#include "ReportAccess.h"
 
 #include <gtest/gtest.h>
 
@@ -282,7 +283,7 @@ TEST(UReportDocText, ATextThatWasMadeElsewhereIsTakenOver)
     kareport::LoadedText loaded;
     ASSERT_EQ(kareport::loadReportText("a\nb\nc", loaded), kareport::TextLoading::Whole);
     loaded.pageStarts = {0, 3};
-    t.report.TakeText(loaded);
+    kareport::ReportAccess::takeText(t.report, loaded);
     EXPECT_EQ(textOf(t.report), QStringLiteral("a\r\nb\r\nc"));
     EXPECT_EQ(t.report.GetPageStarts(), (std::vector<qint64>{0, 3}));
     EXPECT_EQ(t.report.GetLineCount(), lines + 2);

@@ -154,7 +154,7 @@ TEST(TemplateFile, ScansWithoutTabsAndLineEnds)
          "inside tags and values as well"},
     };
     for (const StripRow &row : stripRows) {
-        const ScanText scanned = fileOf(row.bytes).scanText();
+        const ScanText scanned = scanTextOf(fileOf(row.bytes));
         EXPECT_EQ(scanned.text(), QString::fromUtf16(row.scanned)) << row.reason;
         std::vector<qsizetype> places;
         for (qsizetype i = 0; i <= scanned.size(); ++i) {
@@ -187,7 +187,7 @@ TEST(TemplateFile, ReadsAnEmptyFile)
     const auto read = TemplateFile::read(path);
     ASSERT_TRUE(read);
     EXPECT_TRUE(read->text().isEmpty());
-    EXPECT_TRUE(read->scanText().isEmpty());
+    EXPECT_TRUE(scanTextOf(*read).isEmpty());
 }
 
 TEST(TemplateFile, CannotReadWhatIsNotAFile)
@@ -238,7 +238,7 @@ TEST(TemplateFile, IsReadForScanningAsItsTextIsScanned)
         file.close();
         const auto scanned = TemplateFile::readScanned(path);
         ASSERT_TRUE(scanned);
-        ASSERT_EQ(*scanned, TemplateFile(bytes).scanText().text()) << bytes.toHex(' ').constData();
+        ASSERT_EQ(*scanned, scanTextOf(TemplateFile(bytes)).text()) << bytes.toHex(' ').constData();
     }
     EXPECT_FALSE(TemplateFile::readScanned(folder.filePath(QStringLiteral("missing.xml"))));
     EXPECT_FALSE(TemplateFile::readScanned(folder.path())) << "a folder";

@@ -1,6 +1,5 @@
 #include "JobCheck.h"
 
-#include "CommandSetup.h"
 #include "Interrupt.h"
 #include "JobFiles.h"
 #include "JobReader.h"
@@ -9,7 +8,6 @@
 #include "TemplateCheck.h"
 #include "TemplateSource.h"
 #include "UReportDoc.h"
-#include "Xlate.h"
 
 #include <QIODevice>
 
@@ -21,7 +19,7 @@ namespace kareport
 namespace
 {
 
-/// Takes the text of a report that nobody keeps.
+/// Takes the text of a report that is not kept.
 class NoDevice : public QIODevice
 {
 public:
@@ -40,7 +38,7 @@ void addTemplateRemarks(CheckedFile &checked, const QString &path, const Templat
     }
 }
 
-/// What is wrong with the template of a job itself. A file that cannot be read is said when the job is run.
+/// What is wrong with the template of a job itself. A file that cannot be read is reported when the job is run.
 void checkTemplateOf(const Job &job, CheckedFile &checked)
 {
     if (!job.reportTemplate) {
@@ -56,7 +54,7 @@ void checkTemplateOf(const Job &job, CheckedFile &checked)
 void addNotes(CheckedFile &checked, const JobNotes &notes, bool isStrict)
 {
     for (const JobNote &note : notes.all()) {
-        // A unit that nobody has said is worth a look before it is printed, though not each time that it is.
+        // An assumed unit is worth a look before the report is printed, though not each time that it is.
         if (note.isToBeSaid() || note.kind == JobNote::Kind::AssumedUnit) {
             checked.add(isStrict && note.isMistake(), note.about);
         }
@@ -104,8 +102,8 @@ CheckedFile checkTemplateFile(const QString &file)
     return checked;
 }
 
-CheckedFile checkJob(const QString &file, Expected<JsonSource> source, const QStringList &sets, bool isStrict,
-                     const QString &notesFile, Progress &progress)
+CheckedFile checkJob(const QString &file, const Expected<JsonSource> &source, bool isStrict, const QString &notesFile,
+                     Progress &progress)
 {
     CheckedFile checked;
     checked.file = file;
@@ -114,11 +112,7 @@ CheckedFile checkJob(const QString &file, Expected<JsonSource> source, const QSt
         checked.add(true, *error);
         return checked;
     }
-    auto &json = std::get<JsonSource>(source);
-    if (const auto wrong = applySets(json, sets)) {
-        checked.wrongSet = wrong;
-        return checked;
-    }
+    const auto &json = std::get<JsonSource>(source);
     auto read = readJob(json);
     if (const InputError *error = errorOf(read)) {
         checked.add(true, *error);

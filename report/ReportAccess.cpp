@@ -1,0 +1,41 @@
+#include "ReportAccess.h"
+
+#include "LoadedText.h"
+#include "Placeholders.h"
+#include "ReportParts.h"
+#include "UReportDoc.h"
+
+#include <utility>
+
+namespace kareport
+{
+
+void ReportAccess::takeText(UReportDoc &report, LoadedText &text)
+{
+    ReportParts &parts = *report.parts_;
+    ++parts.editCount;
+    parts.page.exchangeText(text.text, std::move(text.pageStarts), text.lineEnds);
+    report.SetModifiedFlag(true);
+}
+
+void ReportAccess::setHooks(UReportDoc &report, const ReportHooks &hooks)
+{
+    ReportParts &parts = *report.parts_;
+    parts.hooks = hooks;
+    parts.data.remarks = hooks.remarks;
+    const Placeholders *placeholders = hooks.placeholders;
+    parts.page.setPageMarks(placeholders != nullptr);
+    parts.data.labelText = nullptr;
+    if (placeholders != nullptr) {
+        parts.data.labelText = [placeholders](const QString &label, const QString &title) {
+            return placeholders->labelOf(label, title);
+        };
+    }
+}
+
+const ReportHooks &ReportAccess::hooks(const UReportDoc &report)
+{
+    return report.parts_->hooks;
+}
+
+} // namespace kareport

@@ -1,0 +1,34 @@
+#pragma once
+
+class UReportDoc;
+
+namespace kareport
+{
+
+class Placeholders;
+struct DataRemarks;
+struct LoadedText;
+
+/// What a job has its report written with. Nothing of it is owned.
+struct ReportHooks
+{
+    const Placeholders *placeholders = nullptr; ///< of labels and headings; null where all texts stay as they are
+    DataRemarks *remarks =
+        nullptr; ///< receives what the table or block written last does not show as it is; may be null
+};
+
+/// What the programs of this project do with a report and a host does not: it cannot make what the functions take.
+struct ReportAccess
+{
+    /// Takes over a text that was made elsewhere, as on another thread, in a time that does not grow with it. Its lines are
+    /// counted as if they had been written, and its pages begin where it says. Neither rich text nor a report window is
+    /// notified of it.
+    /// @param text  is handed the text before it
+    static void takeText(UReportDoc &report, LoadedText &text);
+
+    /// Sets what is written from now on is written with. With placeholders its pages have page marks.
+    static void setHooks(UReportDoc &report, const ReportHooks &hooks);
+    static const ReportHooks &hooks(const UReportDoc &report);
+};
+
+} // namespace kareport
