@@ -1,6 +1,5 @@
 #include "PdfExport.h"
 #include "ProcessorTime.h"
-#include "Profile.h"
 #include "UReportDoc.h"
 
 #include <QBuffer>
@@ -34,7 +33,6 @@ void writeRows(UReportDoc &report, qint64 lines)
 /// Pages of 72 lines; compare the rates at N and 10 N.
 void pdfPages(benchmark::State &state)
 {
-    kareport::setProfileStore(kareport::makeMemoryProfile());
     UReportDoc report;
     report.FixPage(72, 80);
     report.SetPageSize();
@@ -54,7 +52,6 @@ BENCHMARK(pdfPages)->Arg(100)->Arg(1000)->Arg(10'000)->Unit(benchmark::kMillisec
 
 void saveReportFile(benchmark::State &state)
 {
-    kareport::setProfileStore(kareport::makeMemoryProfile());
     const QTemporaryDir folder(QStringLiteral("/dev/shm/ka_bench"));
     UReportDoc report;
     writeRows(report, state.range(0));
@@ -67,7 +64,6 @@ BENCHMARK(saveReportFile)->Arg(120'000)->Arg(1'200'000)->Unit(benchmark::kMillis
 
 void loadReportFile(benchmark::State &state)
 {
-    kareport::setProfileStore(kareport::makeMemoryProfile());
     const QTemporaryDir folder(QStringLiteral("/dev/shm/ka_bench"));
     const QString file = folder.filePath(QStringLiteral("a.rep"));
     {
@@ -88,7 +84,6 @@ BENCHMARK(loadReportFile)->Arg(120'000)->Arg(1'200'000)->Unit(benchmark::kMillis
 /// Writing the lines in rich-text mode and assembling the document.
 void richTextImage(benchmark::State &state)
 {
-    kareport::setProfileStore(kareport::makeMemoryProfile());
     UReportDoc report;
     report.SetRTFDataFlag(true);
     writeRows(report, state.range(0));

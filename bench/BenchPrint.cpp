@@ -74,6 +74,18 @@ void countPrintPages(benchmark::State &state)
 }
 BENCHMARK(countPrintPages)->Arg(100)->Arg(1000)->Arg(10'000)->Unit(benchmark::kMillisecond);
 
+/// One page in the middle of a line of that many pages: in the time of a page, not of the line.
+void pageOfALongLine(benchmark::State &state)
+{
+    Printed printed(1);
+    printed.document.setPlainText(QStringLiteral("words and words ").repeated(state.range(0) * 450));
+    for (auto _ : state) {
+        kareport::LinePager pager(printed.document, printed.printer);
+        benchmark::DoNotOptimize(pager.layOut(printed.page, pager.length() / 2, -1));
+    }
+}
+BENCHMARK(pageOfALongLine)->Arg(40)->Arg(400)->Unit(benchmark::kMillisecond);
+
 /// Pages of a job into a file, with its progress; compare the rates at N and 10 N, and the memory that a job takes above
 /// the open text.
 void printPages(benchmark::State &state)

@@ -1,5 +1,4 @@
 #include "DefaultPrinter.h"
-#include "Profile.h"
 #include "UReportDoc.h"
 
 #include "ProcessorTime.h"
@@ -12,7 +11,6 @@ namespace
 /// Lines of 80 characters; compare the rates at N and 10 N.
 void writeLines(benchmark::State &state)
 {
-    kareport::setProfileStore(kareport::makeMemoryProfile());
     const QString line(80, u'x');
     const ProcessorTime time;
     for (auto _ : state) {

@@ -98,4 +98,21 @@ void writeFormattedText(benchmark::State &state)
 }
 BENCHMARK(writeFormattedText)->Arg(10'000)->Arg(100'000)->Unit(benchmark::kMillisecond);
 
+/// Fonts and tab stops that differ in each line: they look alike until they are compared one by one.
+void readManyFormats(benchmark::State &state)
+{
+    QByteArray bytes("{\\rtf1{\\fonttbl");
+    QByteArray lines;
+    for (qint64 i = 0; i < state.range(0); ++i) {
+        const QByteArray number = QByteArray::number(i);
+        bytes += "{\\f" + number + " F" + number + ";}";
+        // Tab stops are limited to the width of a page.
+        lines += i == 0 ? "" : "\\par";
+        lines += "\\pard\\tx" + QByteArray::number(i % 300) + "\\tx" + QByteArray::number(15 * (i / 300)) + "\\f" +
+                 number + " x";
+    }
+    read(state, bytes + "}" + lines + "}");
+}
+BENCHMARK(readManyFormats)->Arg(6'000)->Arg(60'000)->Unit(benchmark::kMillisecond);
+
 } // namespace

@@ -4,14 +4,11 @@ import random
 
 from measure import Command, Result, in_turn
 from parts import benchmarks, seconds
+from rows import make_template
 from work import Comparison, Limit, make, ratio
 
 COLUMNS = [("Name", "8", "RIGHT", "NUMBER"), ("Code", "6", "LEFT", "TEXT"), ("Northing", "14.3", "RIGHT", "COORDINATE"),
            ("Easting", "14.3", "RIGHT", "COORDINATE"), ("Elevation", "10.3", "RIGHT", "ELEVATION")]
-TEMPLATE = """<ReportTemplate><Name>POINTS</Name><Title>Points</Title><Tables><Table><Name>Points</Name><Use>D</Use>
-<OutputList>%s</OutputList></Table></Tables><Dictionaries><Dictionary><DictionaryName>D</DictionaryName><VariableList>
-%s</VariableList></Dictionary></Dictionaries><Options><Separator>32</Separator></Options></ReportTemplate>
-"""
 SHEET = """<xsl:stylesheet version="1.0" xmlns:xsl="http://www.w3.org/1999/XSL/Transform"
  xmlns:l="http://www.landxml.org/schema/LandXML-1.2"><xsl:output method="text"/>
 <xsl:template match="/"><xsl:for-each select="l:LandXML/l:CgPoints/l:CgPoint">
@@ -47,12 +44,7 @@ def make_file(path, points, records):
 
 
 def make_files(folder, points, records):
-    fields = "".join(f"<Field><VariableName>{n}</VariableName><Label>{n}</Label><Format>{f}</Format>"
-                     f"<Align>{a}</Align></Field>\n" for n, f, a, _ in COLUMNS)
-    variables = "".join(f"<Variable><ID>{i}</ID><VariableName>{n}</VariableName><Type>{t}</Type></Variable>\n"
-                        for i, (n, _, _, t) in enumerate(COLUMNS, 1))
-    with open(f"{folder}/points.xml", "w") as file:
-        file.write(TEMPLATE % (fields, variables))
+    make_template(folder, COLUMNS)
     with open(f"{folder}/points.xsl", "w") as file:
         file.write(SHEET)
     with open(f"{folder}/points.json", "w") as file:

@@ -18,11 +18,13 @@ SQL = (f"SELECT printf('{FORMAT}',number,northing,easting,elevation,station,name
 FIXED = "".join(f'${name}=fmtnum(${name},"%.3f");' for name in ("northing", "easting", "elevation", "station"))
 
 
-def make_template(folder):
+def make_template(folder, columns=None):
+    """A template POINTS with a table of columns: variable, format, alignment and type."""
+    columns = columns or COLUMNS
     fields = "".join(f"<Field><VariableName>{n}</VariableName><Label>{n}</Label><Format>{f}</Format>"
-                     f"<Align>{a}</Align></Field>\n" for n, f, a, _ in COLUMNS)
+                     f"<Align>{a}</Align></Field>\n" for n, f, a, _ in columns)
     variables = "".join(f"<Variable><ID>{i}</ID><VariableName>{n}</VariableName><Type>{t}</Type></Variable>\n"
-                        for i, (n, _, _, t) in enumerate(COLUMNS, 1))
+                        for i, (n, _, _, t) in enumerate(columns, 1))
     with open(f"{folder}/points.xml", "w") as file:
         file.write(TEMPLATE % (fields, variables))
 
