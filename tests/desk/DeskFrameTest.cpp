@@ -14,6 +14,8 @@
 #include <QDockWidget>
 #include <QDropEvent>
 #include <QMimeData>
+#include <QSignalSpy>
+#include <QTimer>
 #include <QToolBar>
 
 #include <gtest/gtest.h>
@@ -131,7 +133,10 @@ TEST(DeskFrame, AReportWhoseWindowIsClosedCloses)
     folder.put("a.json", lineJob());
     ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.json")));
     UReportDoc *report = Desk::reports().front();
-    QTest::qWait(600); // what is shown stays open
+    auto *look = desk.frame->findChild<QTimer *>(DeskFrame::unseenTimerName);
+    ASSERT_NE(look, nullptr);
+    QSignalSpy looks(look, &QTimer::timeout);
+    ASSERT_TRUE(QTest::qWaitFor([&looks] { return looks.count() >= 1; })) << "what is shown stays open";
     ASSERT_TRUE(UReportDoc::IsReportAvailable(report));
     dynamic_cast<UReportWindowDlg *>(report->GetReportWindow())->OnPressCloseButton();
     EXPECT_TRUE(QTest::qWaitFor([report] { return !UReportDoc::IsReportAvailable(report); }))

@@ -59,11 +59,14 @@ TEST(WorkAside, LetsTheWindowsAnswer)
 TEST(WorkAside, ThatIsDoneInAMomentShowsNothing)
 {
     bool isShown = false;
+    std::atomic<bool> hasLooked = false;
     QTimer lookTimer;
-    QObject::connect(&lookTimer, &QTimer::timeout, &lookTimer, [&] { isShown = isShown || shownDialog() != nullptr; });
-    lookTimer.start(step);
-    EXPECT_TRUE(doAside(QString(), UserInput::Taken,
-                        [](AsideState &) { std::this_thread::sleep_for(std::chrono::milliseconds(100)); }));
+    QObject::connect(&lookTimer, &QTimer::timeout, &lookTimer, [&] {
+        isShown = isShown || shownDialog() != nullptr;
+        hasLooked = true;
+    });
+    lookTimer.start(0);
+    EXPECT_TRUE(doAside(QString(), UserInput::Taken, [&hasLooked](AsideState &) { waitFor(hasLooked); }));
     EXPECT_FALSE(isShown);
 }
 

@@ -1,9 +1,9 @@
 #include "StandardText.h"
 
+#include "BracketTranslator.h"
 #include "PrintQt.h"
 
 #include <QCoreApplication>
-#include <QTranslator>
 
 #include <gtest/gtest.h>
 
@@ -34,24 +34,10 @@ TEST(StandardText, IsFoundByItsNumber)
     }
 }
 
-/// Puts every text into brackets.
-class Translator : public QTranslator
-{
-public:
-    Translator() { QCoreApplication::installTranslator(this); }
-    ~Translator() override { QCoreApplication::removeTranslator(this); }
-
-    bool isEmpty() const override { return false; }
-    QString translate(const char * /*context*/, const char *text, const char * /*note*/, int /*number*/) const override
-    {
-        return u'[' + QString::fromUtf8(text) + u']';
-    }
-};
-
 TEST(StandardText, IsInTheCurrentLanguage)
 {
     {
-        const Translator translator;
+        const BracketTranslator translator;
         EXPECT_EQ(standardText(61442), QStringLiteral("[All Files (*.*)]"));
         EXPECT_EQ(standardText(61701), QStringLiteral("[The file is too large to open.]"));
     }

@@ -127,29 +127,6 @@ TEST(CommandLineInput, BlanksAroundNamesOfColumnsLoseNoValue)
     EXPECT_EQ(folder.run("render job.json -o -").out, plain.out);
 }
 
-TEST(CommandLineInput, ATemplateOf200MegabytesIsRefusedAtOnce)
-{
-    for (const char *line :
-         {"render job.json -o kept.rep", "templates t.xml", "templates t.xml --name CONTROL", "check t.xml"})
-    {
-        const CommandLineFolder folder;
-        folder.put("kept.rep", "kept");
-        QFile big(folder.path("t.xml"));
-        ASSERT_TRUE(big.resize(qint64(200) << 20));
-        QElapsedTimer timer;
-        timer.start();
-        const ProgramRun run = folder.run(line);
-        EXPECT_EQ(run.status, 2) << line << "\n" << run.all().constData();
-        const QByteArray said = run.out + run.err;
-        EXPECT_TRUE(said.contains("t.xml:1:1: error: ")) << said.constData();
-        EXPECT_TRUE(said.contains("200 MB")) << said.constData();
-        EXPECT_TRUE(said.contains("expected")) << said.constData();
-        EXPECT_EQ(said.count('\n'), 1) << said.constData();
-        EXPECT_EQ(folder.bytesOf("kept.rep"), "kept");
-        EXPECT_LT(timer.elapsed(), 20'000) << line << ": it is not read";
-    }
-}
-
 TEST(CommandLineInput, TheShortFormNamesTheFileThatIsWrong)
 {
     struct ShortRow

@@ -90,6 +90,30 @@ TEST(CommandLineMemory, WhereverItEndsTheProgramSaysSo)
     }
 }
 
+TEST(CommandLineMemory, ATemplateOf200MegabytesIsRefusedUnread)
+{
+#if defined(__SANITIZE_ADDRESS__)
+    GTEST_SKIP() << "the address sanitizer needs more address space than any limit leaves";
+#endif
+    constexpr rlim_t megabytes = ownMegabytes + 100; // there is no room for the file
+    for (const char *line :
+         {"render job.json -o kept.rep", "templates t.xml", "templates t.xml --name CONTROL", "check t.xml"})
+    {
+        const CommandLineFolder folder;
+        folder.put("kept.rep", "kept");
+        QFile big(folder.path("t.xml"));
+        ASSERT_TRUE(big.resize(qint64(200) << 20));
+        const ProgramRun run = runWithin(folder.path(), words(line), megabytes);
+        EXPECT_EQ(run.status, 2) << line << "\n" << run.all().constData();
+        const QByteArray said = run.out + run.err;
+        EXPECT_TRUE(said.contains("t.xml:1:1: error: ")) << said.constData();
+        EXPECT_TRUE(said.contains("200 MB")) << said.constData();
+        EXPECT_TRUE(said.contains("expected")) << said.constData();
+        EXPECT_EQ(said.count('\n'), 1) << said.constData();
+        EXPECT_EQ(folder.bytesOf("kept.rep"), "kept");
+    }
+}
+
 /// The peak of the memory of a command of the shell in a folder, in kilobytes; -1 when it fails. "kareport" is the program.
 long peakOfCommand(const QString &folder, QByteArray command)
 {

@@ -7,7 +7,6 @@
 #include "PrivateCups.h"
 
 #include <QApplication>
-#include <QElapsedTimer>
 #include <QFile>
 #include <QFileInfo>
 #include <QPrinterInfo>
@@ -123,12 +122,9 @@ TEST(PrintQueuePosix, APrintServerThatGoesAwayInTheMiddleIsReported)
         }
         return print(painter, page);
     };
-    QElapsedTimer timer;
-    timer.start();
     const PrintOutcome outcome = printOn(QStringLiteral("Whole"), pages);
     EXPECT_EQ(outcome.result, PrintResult::Failed);
     EXPECT_FALSE(outcome.reason.isEmpty());
-    EXPECT_LT(timer.elapsed(), 5000) << "no waiting for what does not come";
 }
 
 TEST(PrintJobPosix, AFullDiskLeavesTheFileAsItWas)

@@ -1,7 +1,6 @@
 #include "PostgresObjectList.h"
 #include "SurveyRows.h"
 
-#include <QElapsedTimer>
 #include <QTemporaryDir>
 
 #include <sys/socket.h>
@@ -86,14 +85,12 @@ private:
 
 TEST_F(SilentServer, NeedNotBeWaitedFor)
 {
-    QElapsedTimer timer;
-    timer.start();
+    // Without an answer and without a time limit of the connection only the stop ends the wait.
     int calls = 0;
     PostgresObjectList list(query(), survey::variables(), [&calls](std::size_t) { return ++calls < 5; });
     EXPECT_EQ(list.GetAt(0), nullptr);
     EXPECT_FALSE(list.error()) << "to be stopped is no mistake of the data";
     EXPECT_GE(calls, 5);
-    EXPECT_LT(timer.elapsed(), 5000);
 }
 
 TEST_F(SilentServer, IsSaidAfterTheTimeOfTheConnection)

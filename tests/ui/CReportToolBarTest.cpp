@@ -1,5 +1,6 @@
 #include "CReportToolBar.h"
 
+#include "BracketTranslator.h"
 #include "PrintQt.h"
 #include "ReportResources.h"
 #include "UXTPMDIFrameWnd.h"
@@ -12,7 +13,6 @@
 #include <QTest>
 #include <QToolButton>
 #include <QToolTip>
-#include <QTranslator>
 #include <QVBoxLayout>
 #include <QWindow>
 
@@ -121,23 +121,9 @@ TEST(CReportToolBar, AnActionThatIsNotOneOfItsCommandsHasNoName)
     EXPECT_EQ(text, QString());
 }
 
-/// Gives every text back in brackets.
-class Translator : public QTranslator
-{
-public:
-    Translator() { QCoreApplication::installTranslator(this); }
-    ~Translator() override { QCoreApplication::removeTranslator(this); }
-
-    QString translate(const char * /*context*/, const char *text, const char * /*note*/, int /*number*/) const override
-    {
-        return u'[' + QString::fromUtf8(text) + u']';
-    }
-    bool isEmpty() const override { return false; }
-};
-
 TEST(CReportToolBar, NamesAreInTheUsersLanguage)
 {
-    const Translator translator;
+    const BracketTranslator translator;
     Owner owner;
     const CReportToolBar bar(&owner);
     for (std::size_t i = 0; i < ids.size(); ++i) {
@@ -160,7 +146,7 @@ TEST(CReportToolBar, NamesFollowAChangeOfTheLanguage)
         QCoreApplication::sendPostedEvents();
     };
     {
-        const Translator translator;
+        const BracketTranslator translator;
         change();
         for (std::size_t i = 0; i < ids.size(); ++i) {
             const QString expected = u'[' + QString::fromUtf8(names.at(i)) + u']';

@@ -1,9 +1,8 @@
 #include "ReportWindowFixture.h"
 
+#include "BracketTranslator.h"
 #include "ReportContent.h"
 #include "XInput.h"
-
-#include <QTranslator>
 
 #include <gtest/gtest.h>
 
@@ -55,26 +54,12 @@ TEST_F(ReportWindow, IsCreatedAtTheBottomOfTheFrame)
     EXPECT_NEAR(window.GetDock()->height(), window.GetDock()->sizeHint().height(), 40);
 }
 
-/// Gives every text back in brackets.
-class Translator : public QTranslator
-{
-public:
-    Translator() { QCoreApplication::installTranslator(this); }
-    ~Translator() override { QCoreApplication::removeTranslator(this); }
-
-    QString translate(const char * /*context*/, const char *text, const char * /*note*/, int /*number*/) const override
-    {
-        return u'[' + QString::fromUtf8(text) + u']';
-    }
-    bool isEmpty() const override { return false; }
-};
-
 TEST_F(ReportWindow, ItsTextsAreTranslatedWhenItIsPrepared)
 {
     ASSERT_TRUE(create());
     window.setActive(true);
     ASSERT_EQ(window.GetList()->accessibleName(), QStringLiteral("Report lines"));
-    const Translator translator;
+    const BracketTranslator translator;
     EXPECT_EQ(window.HandleInitDialog(), 0);
     EXPECT_FALSE(window.IsActive());
     EXPECT_EQ(window.GetList()->accessibleName(), QStringLiteral("[Report lines]"));

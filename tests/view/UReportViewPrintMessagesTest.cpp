@@ -1,11 +1,11 @@
 #include "UReportView.h"
 
+#include "BracketTranslator.h"
 #include "PdfReadBack.h"
 #include "PrintFixture.h"
 
 #include <QFile>
 #include <QPrintPreviewWidget>
-#include <QTranslator>
 
 #include <gmock/gmock.h>
 
@@ -56,20 +56,6 @@ TEST(UReportViewPrintMessages, WithoutAPrinterEveryCommandSaysSo)
     EXPECT_FALSE(UPreviewDlg::IsModulePrinterOrientationPortrait()) << "put back";
 }
 
-/// Gives every text back in brackets.
-class Translator : public QTranslator
-{
-public:
-    Translator() { QCoreApplication::installTranslator(this); }
-    ~Translator() override { QCoreApplication::removeTranslator(this); }
-
-    QString translate(const char * /*context*/, const char *text, const char * /*note*/, int /*number*/) const override
-    {
-        return u'[' + QString::fromUtf8(text) + u']';
-    }
-    bool isEmpty() const override { return false; }
-};
-
 TEST(UReportViewPrintMessages, WithoutAPrinterTheBoxesAreTheUsualOnes)
 {
     const AnsweredPrinting printing;
@@ -82,7 +68,7 @@ TEST(UReportViewPrintMessages, WithoutAPrinterTheBoxesAreTheUsualOnes)
         return MessageAnswer::Ok;
     });
     {
-        const Translator translator;
+        const BracketTranslator translator;
         view.OnReportPrint();
         view.OnPageSetup();
     }

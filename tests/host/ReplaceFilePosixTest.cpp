@@ -2,7 +2,6 @@
 
 #include "FileSizeLimit.h"
 #include "FrameFixture.h"
-#include "ReportFixture.h"
 
 #include <QDir>
 #include <QFile>
@@ -18,7 +17,7 @@
 namespace
 {
 
-QString reportWithOldContent(const QTemporaryDir &folder)
+QString oldFileIn(const QTemporaryDir &folder)
 {
     const QString path = folder.filePath(QStringLiteral("a.rep"));
     QFile file(path);
@@ -51,7 +50,7 @@ TEST(ReplaceFilePosix, AFullDiskLeavesTheOldFile)
 {
     for (const Disk &disk : disks) {
         const QTemporaryDir folder;
-        const QString path = reportWithOldContent(folder);
+        const QString path = oldFileIn(folder);
         QString error;
         bool done = false;
         {
@@ -62,26 +61,6 @@ TEST(ReplaceFilePosix, AFullDiskLeavesTheOldFile)
         EXPECT_EQ(done, disk.fits) << disk.reason;
         EXPECT_EQ(error, disk.fits ? QString() : QStringLiteral("File too large")) << disk.reason;
         EXPECT_EQ(contentOf(path), disk.fits ? std::string(100, 'x') : "old content") << disk.reason;
-        EXPECT_EQ(filesIn(folder), 1) << disk.reason;
-    }
-}
-
-TEST(ReplaceFilePosix, AReportThatDoesNotFitOnTheDiskStaysModified)
-{
-    const FixedSurroundings surroundings;
-    for (const Disk &disk : disks) {
-        const QTemporaryDir folder;
-        const QString path = reportWithOldContent(folder);
-        UReportDoc report;
-        ASSERT_TRUE(report.Write(QString(disk.size - 3, u'x'), 0)); // after the mark of three bytes
-        bool saved = false;
-        {
-            const FileSizeLimit limit(disk.limit);
-            saved = report.OnSaveDocument(path);
-        }
-        EXPECT_EQ(saved, disk.fits) << disk.reason;
-        EXPECT_EQ(report.IsModified(), !disk.fits) << disk.reason;
-        EXPECT_EQ(contentOf(path), disk.fits ? "\xEF\xBB\xBF" + std::string(97, 'x') : "old content") << disk.reason;
         EXPECT_EQ(filesIn(folder), 1) << disk.reason;
     }
 }
