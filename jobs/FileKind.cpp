@@ -25,7 +25,7 @@ constexpr EndingRow endings[] = {
     {u".rtf", FileKind::RichText},
 };
 
-/// What a file begins with; empty for what cannot be read. A pipe is not looked into: its bytes would be gone.
+/// What a file begins with; empty for what cannot be read. A pipe is not opened: its bytes would be gone.
 QByteArray beginOf(const QString &path, qint64 bytes)
 {
     QFile file(path);

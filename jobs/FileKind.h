@@ -24,7 +24,7 @@ bool hasEnding(QStringView name, QStringView ending);
 /// The kind that the ending of a file name says; nothing where it says none, as that of a report file.
 std::optional<FileKind> fileKindOf(QStringView name);
 
-/// Whether a file is a job. Standard input, "-", is one. A name that says no kind is looked into: a job begins with a
+/// Whether a file is a job. Standard input, "-", is one. A file whose name does not tell is opened: a job begins with a
 /// brace.
 bool isJobFile(const QString &file);
 

@@ -22,15 +22,15 @@ QHash<QString, QString> sourcesOf(const Job &job, const QString &path)
     QHash<QString, QString> sources;
     for (const Job::DataSet &set : job.data) {
         for (const QString &file : set.source->files()) {
-            sources.insert(fileIdentity(file), Xlate("\"%1\" is data of the job: an output of its own was expected"));
+            sources.insert(fileIdentity(file), Xlate("\"%1\" is data of the job: another file was expected"));
         }
     }
     if (job.reportTemplate) {
         sources.insert(fileIdentity(job.reportTemplate->file),
-                       Xlate("\"%1\" is the template of the job: an output of its own was expected"));
+                       Xlate("\"%1\" is the template of the job: another file was expected"));
     }
     if (!path.isEmpty()) {
-        sources.insert(fileIdentity(path), Xlate("\"%1\" is the job itself: an output of its own was expected"));
+        sources.insert(fileIdentity(path), Xlate("\"%1\" is the job itself: another file was expected"));
     }
     return sources;
 }
@@ -63,9 +63,8 @@ std::optional<OutputClash> outputClash(const Job &job, const std::vector<Output>
         const Output *other = earlier.value(identity);
         // Both reports are written to standard output, one after the other.
         if (other != nullptr && !(other->isStandardOutput() && output.isStandardOutput())) {
-            return OutputClash{
-                i, Xlate("\"%1\" is the file of the output \"%2\" already: an output of its own was expected")
-                       .arg(output.file, other->file)};
+            return OutputClash{i, Xlate("\"%1\" is the file of the output \"%2\" already: another file was expected")
+                                      .arg(output.file, other->file)};
         }
         earlier.insert(identity, &output);
     }

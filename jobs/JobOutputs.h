@@ -41,7 +41,7 @@ using WriteContent = std::function<bool(QIODevice &device, QString &problem)>;
 std::optional<QString> replaceOutput(const Output &output, const WriteContent &write);
 
 /// The output that the text of a job's report can go to while it is written; null when the whole report must be there first:
-/// for any other kind, for several outputs, for what is no file and so cannot be taken back, and for a report that is
+/// for any other kind, for several outputs, for what is not a file and so cannot be taken back, and for a report that is
 /// emptied on the way. @param job  has one output at least
 const Output *streamedOutput(const Job &job);
 

@@ -90,7 +90,7 @@ private:
     StepNotes notes_;
     const std::function<bool()> &isStopped_;
     const Placeholders *placeholders_ = nullptr;
-    std::vector<StepFit> *fits_ = nullptr; ///< null where nobody measures
+    std::vector<StepFit> *fits_ = nullptr; ///< null where nothing is measured
     std::unique_ptr<FormatWidths> widths_;
     std::unique_ptr<VariablePlaces>
         places_; ///< of the template; null until one is asked for, and where it cannot be read

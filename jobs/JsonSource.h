@@ -19,7 +19,7 @@ namespace kareport
 class JsonSource
 {
 public:
-    /// Reads a file; "-" is standard input, and its file names are relative to the current folder. A text that is no JSON, or whose root is no object, is an error.
+    /// Reads a file; "-" is standard input, and its file names are relative to the current folder. A text that is not JSON, or whose root is not an object, is an error.
     static Expected<JsonSource> read(const QString &path);
     /// An object that is in no file; its file names are relative to the current folder.
     static JsonSource fromObject(const QJsonObject &object);

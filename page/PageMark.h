@@ -6,7 +6,7 @@
 namespace kareport
 {
 
-/// Stands in a text for the number of the page that the text is written on: a code that is no character, so that no text
+/// Marks in a text the place of the number of the page that the text is written on: a code that is not a character, so that no text
 /// has it.
 inline constexpr char16_t pageMark = u'\uFDD0';
 

@@ -96,7 +96,7 @@ public:
     bool headerFlag() const { return headerFlag_; }
     /// The header line without its page number, which every page adds.
     void setHeaderLine(const QString &line) { headerLine_ = line; }
-    /// Whether `pageMark` in headings, and where `writeNumberedLine` looks for it, stands for the number of the page.
+    /// Whether `pageMark` in headings, and where `writeNumberedLine` looks for it, is replaced by the number of the page.
     void setPageMarks(bool on) { hasPageMarks_ = on; }
     bool hasPageMarks() const { return hasPageMarks_; }
     void setHeading(PageHeading heading) { heading_ = std::move(heading); }

@@ -12,7 +12,7 @@
 namespace kareport
 {
 
-/// What placeholders such as {lengthUnit} in the texts of a report stand for. "{{" stands for one "{".
+/// The values of placeholders such as {lengthUnit} in the texts of a report. "{{" gives one "{".
 class Placeholders
 {
 public:
@@ -28,7 +28,7 @@ public:
     /// What is wrong with the placeholders of a text, as a sentence that says what was expected; nothing when all are known.
     static std::optional<QString> wrongIn(QStringView text);
 
-    /// A text with what its placeholders stand for; {page} becomes one `pageMark`. What is wrong stays as it is.
+    /// A text with the values of its placeholders; {page} becomes one `pageMark`. What is wrong stays as it is.
     /// @param templateTitle  the title of the report's template
     QString textOf(QStringView text, const QString &templateTitle) const;
     /// The same for the label of a field, where {page} becomes three page marks: the width of a column counts as many

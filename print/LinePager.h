@@ -30,7 +30,7 @@ public:
     const QTextDocument &text() const { return text_; }
     const QPaintDevice &device() const { return device_; }
 
-    /// The lines that the pages of the text were written for. Where a page measured in twips has them but for a rounding,
+    /// The lines that the pages of the text were written for. Where a page measured in twips has them except for rounding,
     /// or one more by a rounding, it takes just as many.
     void setUsualLines(int lines) { usualLines_ = lines; }
 

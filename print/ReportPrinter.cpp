@@ -87,7 +87,7 @@ void fillPrinters(PageSetup &setup)
         const QPrinterInfo info = QPrinterInfo::printerInfo(name);
         std::vector<PageSheet> sheets;
         if (info.isNull()) {
-            sheets.push_back(asSheet(builtInSheet())); // which stands in for a printer
+            sheets.push_back(asSheet(builtInSheet())); // which takes the place of a printer
         } else {
             sheets.push_back(asSheet(info.defaultPageSize()));
             for (const QPageSize &size : info.supportedPageSizes()) {

@@ -5,7 +5,7 @@
 namespace kareport
 {
 
-/// Variable names that stand for something other than a variable.
+/// Variable names that mean something other than a variable.
 enum class FieldMarker
 {
     None,

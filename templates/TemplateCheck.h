@@ -30,7 +30,7 @@ struct TemplateCheckScope
     bool hasPlaceholders = false; ///< labels have placeholders, so that they are not as wide as they look
 };
 
-/// Reads every template of a file as the module reads it and says what the module passes over in silence, in the order
+/// Reads every template of a file as the module reads it and says what the module ignores silently, in the order
 /// of the file. Where memory ends, the one remark is an error that says so.
 std::vector<TemplateRemark> checkTemplates(const TemplateFile &file, const TemplateCheckScope &scope = {});
 

@@ -58,7 +58,7 @@ void TemplateChecker::keepScope(const std::vector<TemplateElement> &templates)
     std::erase_if(found_, [begin, end](const Found &found) { return found.source < begin || found.source >= end; });
 }
 
-/// Remarks on what nobody reads.
+/// Remarks on what is not read.
 void TemplateChecker::checkUnread()
 {
     for (const UnreadPiece &piece : findUnread(scan_)) {
@@ -69,7 +69,7 @@ void TemplateChecker::checkUnread()
         switch (piece.kind) {
         case UnreadPiece::Kind::Element: checkElementName(piece); break;
         case UnreadPiece::Kind::Text:
-            warning(piece.source, Xlate("the text \"%1\" is in no element: nobody reads it").arg(piece.text));
+            warning(piece.source, Xlate("the text \"%1\" is outside of all elements and is not read").arg(piece.text));
             break;
         case UnreadPiece::Kind::Around:
             warning(
@@ -94,9 +94,9 @@ void TemplateChecker::checkElementName(const UnreadPiece &piece)
     }
     const QString &question = known->second;
     if (question.isEmpty()) {
-        warning(piece.source, Xlate("unknown element %1: nobody reads it").arg(tag));
+        warning(piece.source, Xlate("unknown element %1: it is not read").arg(tag));
     } else if (piece.holdsElement) {
-        // What is inside it may be read all the same.
+        // What is inside it may still be read.
         warning(piece.source, Xlate("unknown element %1: %2").arg(tag, question));
     } else {
         error(piece.source, Xlate("unknown element %1: %2").arg(tag, question));

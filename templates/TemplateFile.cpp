@@ -55,7 +55,7 @@ bool hasByteBelow(std::uint64_t bytes, unsigned limit)
     return ((bytes - ones * limit) & ~bytes & tops) != 0;
 }
 
-/// Takes out what is not scanned. None of it is a part of a longer character.
+/// Removes what is not scanned. None of it is a part of a longer character.
 void strip(QByteArray &bytes)
 {
     constexpr std::ptrdiff_t block = sizeof(std::uint64_t);

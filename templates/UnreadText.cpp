@@ -191,7 +191,7 @@ void Walk::noteList(const TagPlace &tag)
     }
 }
 
-/// Passes over what is no tag. With a short closing tag of a list as many characters go as a full one has.
+/// Skips what is not a tag. With a short closing tag of a list as many characters go as a full one has.
 void Walk::takeMarkup()
 {
     const bool isShortTag = text_.sliced(at_).startsWith(u"</>");
@@ -218,7 +218,7 @@ void Walk::takeElement(const TagPlace &tag)
         at_ = isLeaf ? next->end : tag.end;
         return;
     }
-    // Elements around the templates do no harm, but for one that was meant as a template.
+    // Elements around the templates do no harm, except one that was meant as a template.
     const bool isTemplate = holdsElement && !equalFolded(next->name, templateName) &&
                             nearestName(tag.name, QStringList(templateName.toString())) == templateName;
     if (isTemplate) {

@@ -9,7 +9,7 @@
 namespace kareport
 {
 
-/// Something in a template file that nobody reads, although it is no comment and no blank.
+/// Something in a template file that is not read, although it is neither a comment nor blank.
 struct UnreadPiece
 {
     enum class Kind
@@ -26,7 +26,7 @@ struct UnreadPiece
     bool holdsElement = false; ///< of an element: one that is read is inside it
 };
 
-/// What of a file nobody reads, in the order of the file. A file without a template has none: all of it is unread.
+/// The parts of a file that are not read, in the order of the file. A file without a template has none: all of it is unread.
 std::vector<UnreadPiece> findUnread(const ScanText &file);
 
 } // namespace kareport

@@ -85,8 +85,8 @@
     </message>
     <message>
         <location filename="../templates/TemplateChecker.cpp"/>
-        <source>the text "%1" is in no element: nobody reads it</source>
-        <translation>der Text "%1" steht in keinem Element: er wird nicht gelesen</translation>
+        <source>the text "%1" is outside of all elements and is not read</source>
+        <translation>der Text "%1" steht außerhalb aller Elemente und wird nicht gelesen</translation>
     </message>
     <message>
         <location filename="../templates/TemplateChecker.cpp"/>
@@ -100,7 +100,7 @@
     </message>
     <message>
         <location filename="../templates/TemplateChecker.cpp"/>
-        <source>unknown element %1: nobody reads it</source>
+        <source>unknown element %1: it is not read</source>
         <translation>unbekanntes Element %1: es wird nicht gelesen</translation>
     </message>
     <message>
@@ -1858,23 +1858,23 @@
     </message>
     <message>
         <location filename="../jobs/JobFiles.cpp"/>
-        <source>"%1" is data of the job: an output of its own was expected</source>
-        <translation>„%1“ enthält Daten des Auftrags: eine eigene Ausgabe wurde erwartet</translation>
+        <source>"%1" is data of the job: another file was expected</source>
+        <translation>„%1“ enthält Daten des Auftrags: eine andere Datei wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/JobFiles.cpp"/>
-        <source>"%1" is the template of the job: an output of its own was expected</source>
-        <translation>„%1“ ist die Vorlage des Auftrags: eine eigene Ausgabe wurde erwartet</translation>
+        <source>"%1" is the template of the job: another file was expected</source>
+        <translation>„%1“ ist die Vorlage des Auftrags: eine andere Datei wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/JobFiles.cpp"/>
-        <source>"%1" is the job itself: an output of its own was expected</source>
-        <translation>„%1“ ist der Auftrag selbst: eine eigene Ausgabe wurde erwartet</translation>
+        <source>"%1" is the job itself: another file was expected</source>
+        <translation>„%1“ ist der Auftrag selbst: eine andere Datei wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/JobFiles.cpp"/>
-        <source>"%1" is the file of the output "%2" already: an output of its own was expected</source>
-        <translation>„%1“ ist schon die Datei der Ausgabe „%2“: eine eigene Ausgabe wurde erwartet</translation>
+        <source>"%1" is the file of the output "%2" already: another file was expected</source>
+        <translation>„%1“ ist schon die Datei der Ausgabe „%2“: eine andere Datei wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/JobList.cpp"/>
@@ -2424,8 +2424,8 @@
     </message>
     <message>
         <location filename="../apps/kareport/NotesFile.cpp"/>
-        <source>--notes "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
-        <translation>--notes "%1" ist eine Datei für mehrere Aufträge: ein Name mit {} wurde erwartet, was für den Namen der Auftragsdatei steht</translation>
+        <source>--notes "%1" is one file for several jobs: a name with {} was expected, which is replaced by the name of the job file</source>
+        <translation>--notes "%1" ist eine Datei für mehrere Aufträge: ein Name mit {} wurde erwartet; {} wird durch den Namen der Auftragsdatei ersetzt</translation>
     </message>
     <message>
         <location filename="../apps/kareport/NotesFile.cpp"/>
@@ -2439,13 +2439,13 @@
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>
-        <source>"%1" is the file "%2" of this batch: an output of its own was expected</source>
-        <translation>„%1“ ist die Datei „%2“ dieses Stapels: eine eigene Ausgabe wurde erwartet</translation>
+        <source>"%1" is the file "%2" of this batch: another file was expected</source>
+        <translation>„%1“ ist die Datei „%2“ dieses Stapels: eine andere Datei wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>
-        <source>"%1" is written by the job "%2" already: an output of its own was expected</source>
-        <translation>„%1“ wird schon vom Auftrag „%2“ geschrieben: eine eigene Ausgabe wurde erwartet</translation>
+        <source>"%1" is written by the job "%2" already: another file was expected</source>
+        <translation>„%1“ wird schon vom Auftrag „%2“ geschrieben: eine andere Datei wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>
@@ -2504,8 +2504,8 @@
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
-        <source>-o "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
-        <translation>-o "%1" ist eine Datei für mehrere Aufträge: ein Name mit {} wurde erwartet; {} steht für den Namen der Auftragsdatei</translation>
+        <source>-o "%1" is one file for several jobs: a name with {} was expected, which is replaced by the name of the job file</source>
+        <translation>-o "%1" ist eine Datei für mehrere Aufträge: ein Name mit {} wurde erwartet; {} wird durch den Namen der Auftragsdatei ersetzt</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>

@@ -85,8 +85,8 @@
     </message>
     <message>
         <location filename="../templates/TemplateChecker.cpp"/>
-        <source>the text "%1" is in no element: nobody reads it</source>
-        <translation>テキスト "%1" はどの要素の中にもなく、読み込まれません</translation>
+        <source>the text "%1" is outside of all elements and is not read</source>
+        <translation>テキスト "%1" はすべての要素の外にあり、読み込まれません</translation>
     </message>
     <message>
         <location filename="../templates/TemplateChecker.cpp"/>
@@ -100,7 +100,7 @@
     </message>
     <message>
         <location filename="../templates/TemplateChecker.cpp"/>
-        <source>unknown element %1: nobody reads it</source>
+        <source>unknown element %1: it is not read</source>
         <translation>不明な要素 %1: 読み込まれません</translation>
     </message>
     <message>
@@ -1858,23 +1858,23 @@
     </message>
     <message>
         <location filename="../jobs/JobFiles.cpp"/>
-        <source>"%1" is data of the job: an output of its own was expected</source>
-        <translation>"%1" はジョブのデータです: 別の出力が必要です</translation>
+        <source>"%1" is data of the job: another file was expected</source>
+        <translation>"%1" はジョブのデータです: 別のファイルが必要です</translation>
     </message>
     <message>
         <location filename="../jobs/JobFiles.cpp"/>
-        <source>"%1" is the template of the job: an output of its own was expected</source>
-        <translation>"%1" はジョブのテンプレートです: 別の出力が必要です</translation>
+        <source>"%1" is the template of the job: another file was expected</source>
+        <translation>"%1" はジョブのテンプレートです: 別のファイルが必要です</translation>
     </message>
     <message>
         <location filename="../jobs/JobFiles.cpp"/>
-        <source>"%1" is the job itself: an output of its own was expected</source>
-        <translation>"%1" はジョブそのものです: 別の出力が必要です</translation>
+        <source>"%1" is the job itself: another file was expected</source>
+        <translation>"%1" はジョブそのものです: 別のファイルが必要です</translation>
     </message>
     <message>
         <location filename="../jobs/JobFiles.cpp"/>
-        <source>"%1" is the file of the output "%2" already: an output of its own was expected</source>
-        <translation>"%1" はすでに出力 "%2" のファイルです: 別の出力が必要です</translation>
+        <source>"%1" is the file of the output "%2" already: another file was expected</source>
+        <translation>"%1" はすでに出力 "%2" のファイルです: 別のファイルが必要です</translation>
     </message>
     <message>
         <location filename="../jobs/JobList.cpp"/>
@@ -2390,7 +2390,7 @@
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>the output "%1" is the report being read: another file was expected</source>
-        <translation>出力 "%1" は読み込むレポートそのものです: 別の出力が必要です</translation>
+        <translation>出力 "%1" は読み込むレポートそのものです: 別のファイルが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
@@ -2424,8 +2424,8 @@
     </message>
     <message>
         <location filename="../apps/kareport/NotesFile.cpp"/>
-        <source>--notes "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
-        <translation>--notes "%1" は複数のジョブに対して 1 つのファイルです: ジョブファイルの名前を表す {} を含む名前が必要です</translation>
+        <source>--notes "%1" is one file for several jobs: a name with {} was expected, which is replaced by the name of the job file</source>
+        <translation>--notes "%1" は複数のジョブに対して 1 つのファイルです: ジョブファイルの名前に置き換えられる {} を含む名前が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/NotesFile.cpp"/>
@@ -2439,13 +2439,13 @@
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>
-        <source>"%1" is the file "%2" of this batch: an output of its own was expected</source>
-        <translation>"%1" はこの一括処理のファイル "%2" です: 別の出力が必要です</translation>
+        <source>"%1" is the file "%2" of this batch: another file was expected</source>
+        <translation>"%1" はこの一括処理のファイル "%2" です: 別のファイルが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>
-        <source>"%1" is written by the job "%2" already: an output of its own was expected</source>
-        <translation>"%1" はジョブ "%2" がすでに書き込んでいます: 別の出力が必要です</translation>
+        <source>"%1" is written by the job "%2" already: another file was expected</source>
+        <translation>"%1" はジョブ "%2" がすでに書き込んでいます: 別のファイルが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>
@@ -2504,8 +2504,8 @@
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>
-        <source>-o "%1" is one file for several jobs: a name with {} was expected, which stands for the name of the job file</source>
-        <translation>-o "%1" は複数のジョブに対して 1 つのファイルです: ジョブファイル名を表す {} を含む名前が必要です</translation>
+        <source>-o "%1" is one file for several jobs: a name with {} was expected, which is replaced by the name of the job file</source>
+        <translation>-o "%1" は複数のジョブに対して 1 つのファイルです: ジョブファイルの名前に置き換えられる {} を含む名前が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderCommand.cpp"/>

@@ -12,7 +12,7 @@ namespace kareport
 {
 
 // A control makes a block of every line, whatever ends it in the report's text: CR LF, LF, CR, or a separator of paragraphs.
-// The text that it gives back has CR LF in their places. A break within a line, which only rich text has, is an LF there and
+// The text that it returns has CR LF in their places. A break within a line, which only rich text has, is an LF there and
 // ends no block.
 
 /// Whether a text has so many lines where it is shown. Rich text ends with its last line, a text with the line after it.
@@ -22,9 +22,9 @@ bool hasLines(const QString &text, int lineCount);
 /// that begins no line is left out.
 std::vector<int> blocksOfStarts(const QString &text, const std::vector<qint64> &starts);
 
-/// Where a block begins in the text that its control gives back.
+/// Where a block begins in the text that its control returns.
 qint64 startOfBlock(const QTextBlock &block);
-/// The blocks that begin at places, given in ascending order, of the text that their control gives back.
+/// The blocks that begin at places, given in ascending order, of the text that their control returns.
 std::vector<int> blocksAt(const QTextDocument &document, const std::vector<qint64> &starts);
 
 /// A text as a control gives it back that has loaded it, and where pages begin in it.

@@ -84,7 +84,7 @@ bool mayReplace(const QString &path, const SaveRequest &request)
                         MessageButtons::YesNo, MessageIcon::Question}) == MessageAnswer::Yes;
 }
 
-/// Writes a report as a PDF, and says what is not in it or why it could not be written.
+/// Writes a report as a PDF, and reports what is not in it or why it could not be written.
 void exportPdf(const UReportDoc &report, const QString &path)
 {
     PdfNotes notes;

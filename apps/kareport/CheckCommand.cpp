@@ -38,7 +38,7 @@ QString notesFileOf(const CheckCommand &command, const QString &job)
     return namedAfterJob(command.notes.value_or(QString()), job);
 }
 
-/// The job files among those that are checked. Some are looked into.
+/// The job files among those that are checked. Some are opened to find out.
 QStringList jobsOf(const CheckCommand &command)
 {
     QStringList jobs;
@@ -53,9 +53,8 @@ std::optional<QString> notesClash(const CheckCommand &command, const QStringList
     for (const QString &file : command.files) {
         if (file != u"-") {
             taken.insert(fileIdentity(file),
-                         jobs.contains(file)
-                             ? Xlate("\"%1\" is the job itself: an output of its own was expected")
-                             : Xlate("\"%1\" is the template of the job: an output of its own was expected"));
+                         jobs.contains(file) ? Xlate("\"%1\" is the job itself: another file was expected")
+                                             : Xlate("\"%1\" is the template of the job: another file was expected"));
         }
     }
     for (const QString &job : jobs) {
@@ -67,8 +66,7 @@ std::optional<QString> notesClash(const CheckCommand &command, const QStringList
         if (const auto clash = taken.constFind(identity); clash != taken.constEnd()) {
             return clash->arg(notes, notes);
         }
-        taken.insert(identity,
-                     Xlate("\"%1\" is the file of the output \"%2\" already: an output of its own was expected"));
+        taken.insert(identity, Xlate("\"%1\" is the file of the output \"%2\" already: another file was expected"));
     }
     return std::nullopt;
 }

@@ -176,7 +176,7 @@ void CommandLineJob::sayNotes(const std::optional<InputError> &error)
 {
     for (const JobNote &note : notes_.said()) {
         const bool isError = isStrict() && note.isMistake();
-        // One of the notes that are errors is the error that ends the job, which is said after them.
+        // One of the notes that are errors is the error that ends the job, which is reported after them.
         const bool endsJob = isError && error && error->message() == note.about.message();
         if (!endsJob && (isError || !command_.quiet)) {
             eraseProgress();

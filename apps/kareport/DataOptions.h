@@ -14,7 +14,7 @@ namespace kareport
 /// What the command line says about the data of the short form: keys of the data set as options.
 struct DataOptions
 {
-    std::optional<QString> delimiter; ///< "tab" stands for one
+    std::optional<QString> delimiter; ///< "tab" means one
     QStringList columns;              ///< names in their order, or VARIABLE=COLUMN, with commas between them
     std::optional<QString> order;
     QStringList units; ///< QUANTITY=UNIT, with commas between them

@@ -16,8 +16,8 @@ std::optional<QString> wrongNotesFile(const std::optional<QString> &file, bool a
         return Xlate("--notes \"%1\": the name of a file was expected").arg(*file);
     }
     if (file && areSeveral && !file->contains(QStringLiteral("{}"))) {
-        return Xlate("--notes \"%1\" is one file for several jobs: a name with {} was expected, which stands for the "
-                     "name of the job file")
+        return Xlate("--notes \"%1\" is one file for several jobs: a name with {} was expected, which is replaced by "
+                     "the name of the job file")
             .arg(*file);
     }
     return std::nullopt;

@@ -13,7 +13,7 @@ namespace kareport
 /// @param areSeveral  the notes on several jobs go to it
 std::optional<QString> wrongNotesFile(const std::optional<QString> &file, bool areSeveral);
 
-/// The name of an output of a job, in which "{}" stands for the name of the job file. It stays as it is where the job is in no
+/// The name of an output of a job, in which "{}" is replaced by the name of the job file. It stays as it is where the job is in no
 /// file.
 QString namedAfterJob(QString name, const QString &jobFile);
 

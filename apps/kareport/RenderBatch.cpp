@@ -73,12 +73,12 @@ bool RenderBatch::takesFileOfAnother(CommandLineJob &job, const QString &path)
     for (const Output &output : job.job().outputs) {
         const QString identity = outputIdentity(output);
         if (const auto file = kept_.constFind(identity); file != kept_.constEnd() && *file != path) {
-            job.fail(Xlate("\"%1\" is the file \"%2\" of this batch: an output of its own was expected")
-                         .arg(output.file, *file));
+            job.fail(
+                Xlate("\"%1\" is the file \"%2\" of this batch: another file was expected").arg(output.file, *file));
             return true;
         }
         if (const auto writer = writers_.constFind(identity); writer != writers_.constEnd()) {
-            job.fail(Xlate("\"%1\" is written by the job \"%2\" already: an output of its own was expected")
+            job.fail(Xlate("\"%1\" is written by the job \"%2\" already: another file was expected")
                          .arg(output.file, *writer));
             return true;
         }

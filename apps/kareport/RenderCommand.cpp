@@ -69,15 +69,15 @@ std::optional<QString> RenderCommand::wrongOutputs() const
             return wrong;
         }
         if (isBatch() && file != u"-" && !file.contains(QStringLiteral("{}"))) {
-            return Xlate("-o \"%1\" is one file for several jobs: a name with {} was expected, which stands for the "
-                         "name of the job file")
+            return Xlate("-o \"%1\" is one file for several jobs: a name with {} was expected, which is "
+                         "replaced by the name of the job file")
                 .arg(file);
         }
     }
     return wrongNotesFile(notes, isBatch());
 }
 
-/// The job file, or what the short form stands for.
+/// The job file, or the job that the short form describes.
 Expected<JsonSource> RenderCommand::readSource() const
 {
     if (!isShort()) {

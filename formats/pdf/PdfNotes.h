@@ -30,7 +30,7 @@ struct PdfWideLines
 struct KAREPORT_EXPORT PdfNotes
 {
     PdfWideLines reduced;                  ///< lines that made the type of the whole PDF smaller
-    PdfWideLines broken;                   ///< lines that had to be broken all the same
+    PdfWideLines broken;                   ///< lines that still had to be broken
     std::vector<MissingCharacter> missing; ///< in the order in which they occur; U+FFFD or "?" takes their place
     QString problem;                       ///< one sentence, when the PDF could not be made
 

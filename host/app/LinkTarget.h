@@ -12,7 +12,7 @@ namespace kareport
 /// @param user        who follows it
 bool mayFollowLink(unsigned folderMode, unsigned folderOwner, unsigned linkOwner, unsigned user);
 
-/// The file that a name stands for, with every link on the way followed. The file itself need not exist. A name that leads
+/// The file that a name leads to, with every link on the way followed. The file itself need not exist. A name that leads
 /// nowhere is its own target: what is wrong with it shows when it is opened.
 /// @param error  receives a sentence when a link on the way may not be followed; may be null
 /// @return empty when a link may not be followed

@@ -10,7 +10,7 @@
 namespace kareport
 {
 
-/// The order of two values; null stands for a missing entry. A missing one comes first, then numbers by their value,
+/// The order of two values; null means a missing entry. A missing one comes first, then numbers by their value,
 /// then texts by their case-folded characters, then point numbers in natural order. Not-a-number comes before all other
 /// numbers, so that the order stays one.
 std::weak_ordering compareEntries(const UDictEntry *left, const UDictEntry *right);

@@ -99,7 +99,7 @@ void UXTPMDIFrameWnd::WatchTabs()
 
 void UXTPMDIFrameWnd::TabClicked(int index)
 {
-    // A tab that is in front already does not change: the pane gets the keyboard all the same.
+    // A tab that is in front already does not change: the pane still gets the keyboard.
     const auto *tabs = qobject_cast<const QTabBar *>(sender());
     const auto clicked = tabs != nullptr ? tabs->tabData(index).value<quintptr>() : 0;
     for (const QDockWidget *dock : findChildren<QDockWidget *>()) {

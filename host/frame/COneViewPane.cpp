@@ -74,7 +74,7 @@ void COneViewPane::UpdateTitle()
 
 bool COneViewPane::IsVisible() const
 {
-    // A pane behind another tab is open all the same.
+    // A pane behind another tab is still open.
     return dock_ && !dock_->isHidden();
 }
 

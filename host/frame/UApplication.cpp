@@ -67,7 +67,7 @@ void UApplication::CloseAllDocuments()
 
 void UApplication::AddToRecentFileList(const QString &path)
 {
-    // Made anew, so that the list stays as it is when memory ends.
+    // Made again, so that the list stays as it is when memory ends.
     QStringList files;
     files.append(path);
     for (const QString &file : std::as_const(recentFiles_)) {

@@ -66,7 +66,7 @@ void UDocTemplate::CloseAllDocuments()
         UDocument *document = documents_.back();
         document->SetAutoDelete(true);
         document->OnCloseDocument();
-        // A document that defers its closing is destroyed all the same.
+        // A document that defers its closing is destroyed too.
         if (!documents_.empty() && documents_.back() == document) {
             document->CloseAllPanes();
             document->EndDocument();

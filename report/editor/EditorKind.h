@@ -16,7 +16,7 @@ enum class EditorKind
 /// every platform: a user's preferences may come from another one.
 QStringView editorStem(QStringView path);
 
-/// Whether the program is the spreadsheet that can stand in for a word processor.
+/// Whether the program is the spreadsheet that can take the place of a word processor.
 bool isExcelEditor(QStringView path);
 
 /// The kind of an editor by the name of its program, in any case. @param excelOption  whether the report may go to the

@@ -254,7 +254,7 @@ TEST(HostileTemplate, ChecksManyTagsThatAreNotValid)
     }
     EXPECT_EQ(kareport::checkTemplates(kareport::TemplateFile(templateOf(tags))).size(), 10000U);
     EXPECT_EQ(kareport::checkTemplates(kareport::TemplateFile(templateOf(QByteArray(1 << 20, '<')))).size(), 1U)
-        << "a text that nobody reads";
+        << "a text that is not read";
     QByteArray comments;
     for (int i = 0; i < 10000; ++i) {
         comments += "<!-- ";

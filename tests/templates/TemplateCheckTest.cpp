@@ -116,18 +116,18 @@ TEST(TemplateCheck, RemarksOnWhatNobodyReads)
          "the beginning of a name"},
         {align,
          "¦<Unit>m</Unit>",
-         {{"warning", "unknown element <Unit>: nobody reads it"}},
+         {{"warning", "unknown element <Unit>: it is not read"}},
          "an element of another kind"},
         {align,
          "¦<Remark date=\"5\"/>",
-         {{"warning", "unknown element <Remark>: nobody reads it"}},
+         {{"warning", "unknown element <Remark>: it is not read"}},
          "one with an attribute and no content"},
         {align,
          "¦<Remark>¦see ¦<b>there</b> ¦and elsewhere</Remark>",
-         {{"warning", "unknown element <Remark>: nobody reads it"},
-          {"warning", "the text \"see\" is in no element: nobody reads it"},
-          {"warning", "unknown element <b>: nobody reads it"},
-          {"warning", "the text \"and elsewhere\" is in no element: nobody reads it"}},
+         {{"warning", "unknown element <Remark>: it is not read"},
+          {"warning", "the text \"see\" is outside of all elements and is not read"},
+          {"warning", "unknown element <b>: it is not read"},
+          {"warning", "the text \"and elsewhere\" is outside of all elements and is not read"}},
          "one in another"},
         {"    <Dictionaries>",
          "    ¦<Fields><Sort></Sort></Fields><Dictionaries>",
@@ -135,11 +135,11 @@ TEST(TemplateCheck, RemarksOnWhatNobodyReads)
          "what is in it may be read all the same"},
         {align,
          "¦RIGHT",
-         {{"warning", "the text \"RIGHT\" is in no element: nobody reads it"}},
+         {{"warning", "the text \"RIGHT\" is outside of all elements and is not read"}},
          "text between elements"},
         {title,
          "<Title>Stakeout</Title> ¦of\n the harbour",
-         {{"warning", "the text \"of the harbour\" is in no element: nobody reads it"}},
+         {{"warning", "the text \"of the harbour\" is outside of all elements and is not read"}},
          "text after a value"},
         {"</Templates>",
          "</Templates>\n¦two lines\nof text\n",
@@ -152,7 +152,7 @@ TEST(TemplateCheck, RemarksOnWhatNobodyReads)
         {"</Templates>",
          "  ¦<ReportTemplat><Name>B</Name></ReportTemplat></Templates>",
          {{"error", "unknown element <ReportTemplat>: did you mean \"ReportTemplate\"?"}},
-         "a whole template that nobody reads"},
+         "a whole template that is not read"},
     };
     for (const Row &row : rows) {
         expectRemarks(changedTemplate(row.was, row.now), row.remarks, row.reason);
@@ -181,7 +181,7 @@ TEST(TemplateCheck, LeavesTheRemarksOnOneTemplate)
     ASSERT_EQ(ofOne.size(), 2U) << "those on the last one of the name";
     EXPECT_EQ(ofOne[0].text.toStdString(),
               "a template named \"a\" comes before this one: the last one of a name is read");
-    EXPECT_EQ(ofOne[1].text.toStdString(), "the text \"text\" is in no element: nobody reads it");
+    EXPECT_EQ(ofOne[1].text.toStdString(), "the text \"text\" is outside of all elements and is not read");
     EXPECT_TRUE(kareport::checkTemplates(file, {.name = QStringLiteral("B")}).empty());
     EXPECT_TRUE(kareport::checkTemplates(file, {.name = QStringLiteral("C")}).empty()) << "there is none";
 }
