@@ -1,5 +1,7 @@
 #pragma once
 
+#include <QStringView>
+
 #include <algorithm>
 #include <iterator>
 
@@ -8,6 +10,16 @@ namespace kareport
 
 /// The columns from one tab stop to the next.
 inline constexpr int tabColumns = 8;
+
+/// Whether all characters of a text are up to U+00FF.
+inline bool isLatin1(QStringView text)
+{
+    unsigned all = 0;
+    for (const char16_t *at = text.utf16(), *end = at + text.size(); at != end; ++at) {
+        all |= *at;
+    }
+    return all <= 0xFF;
+}
 
 /// Whether a character is a control: it takes no place in a line. A tab is one.
 constexpr bool isControl(char16_t character)

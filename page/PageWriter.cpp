@@ -1,87 +1,18 @@
 #include "PageWriter.h"
 
+#include "LineFeeds.h"
 #include "PageMark.h"
 
-#include <QByteArrayView>
-
-#include <cstdint>
-#include <cstring>
 #include <type_traits>
 
 namespace kareport
 {
-
-namespace
-{
-
-/// Whether a text holds a line feed. Most pieces are short and hold none, and the library's own search, which is made for
-/// long texts, takes most of its time to begin.
-bool holdsLineFeed(QStringView text)
-{
-    constexpr std::uint64_t ones = 0x0001000100010001;
-    constexpr qsizetype atOnce = sizeof ones / sizeof(char16_t);
-    const char16_t *at = text.utf16();
-    const char16_t *const end = at + text.size();
-    std::uint64_t found = 0;
-    for (; end - at >= atOnce; at += atOnce) {
-        std::uint64_t word;
-        std::memcpy(&word, at, sizeof word);
-        // A line feed becomes 0, and taking 1 from it sets the top bit that it did not have.
-        const std::uint64_t difference = word ^ (ones * u'\n');
-        found |= (difference - ones) & ~difference & (ones << 15);
-    }
-    bool isFound = found != 0;
-    for (; at != end; ++at) {
-        isFound = isFound || *at == u'\n';
-    }
-    return isFound;
-}
-
-qsizetype countAll(QStringView text)
-{
-    return holdsLineFeed(text) ? text.count(u'\n') : 0;
-}
-
-qsizetype countAll(QLatin1StringView text)
-{
-    const QByteArrayView bytes(text);
-    return bytes.contains('\n') ? bytes.count('\n') : 0;
-}
-
-template <typename View>
-int countLineFeeds(View text)
-{
-    // One at the end need not be looked for.
-    const int atEnd = text.endsWith(u'\n') ? 1 : 0;
-    return atEnd + static_cast<int>(countAll(text.chopped(atEnd)));
-}
-
-} // namespace
 
 PageWriterObserver::~PageWriterObserver() = default;
 
 PageWriter::PageWriter(PageWriterObserver *observer, ReportText::Reallocate reallocate)
     : observer_(observer), text_(reallocate)
 {}
-
-void PageWriter::clear()
-{
-    text_.clear();
-    starts_.clear();
-    losses_ = 0;
-    lineCount_ = 0;
-    heading_.text.clear();
-    noteChange();
-}
-
-bool PageWriter::emptyIntoOutlet()
-{
-    bool isTaken = false;
-    losesNothing([&] { isTaken = text_.visit([this](auto text) { return outlet_->write(text); }); });
-    text_.drain();
-    starts_.clear();
-    return isTaken;
-}
 
 template <typename View>
 bool PageWriter::tellWritten(View text, int style)
@@ -151,36 +82,6 @@ void PageWriter::lineFeed(qint64 count)
         ++lineCount_;
         noteGrowth();
     }
-}
-
-void PageWriter::exchangeText(ReportText &text, std::vector<qint64> pageStarts, qint64 lineEnds)
-{
-    text_.swap(text);
-    starts_.assign(std::move(pageStarts));
-    lineNumber_ += static_cast<int>(lineEnds);
-    lineCount_ += lineEnds;
-}
-
-bool PageWriter::replace(qint64 at, qint64 removed, QStringView inserted)
-{
-    if (at < 0 || removed < 0 || at > text_.size() || removed > text_.size() - at) {
-        return false;
-    }
-    return whileMemoryLasts(false, [&] {
-        if (text_.owns(inserted)) {
-            return replace(at, removed, inserted.toString());
-        }
-        const bool wantsRemoved = starts_.wantsRemoved(at, removed, inserted.size());
-        const QString removedText = wantsRemoved ? text_.piece(at, removed) : QString();
-        const bool mayBeHeader = inserted.size() > PageStarts::shortestHeader;
-        const bool beginsLine = at == 0 || (mayBeHeader && text_.piece(at - 1, 1) == u"\n");
-        PageStarts::Edit edit = starts_.prepare(at, removed, removedText, inserted, beginsLine);
-        if (!text_.replace(at, removed, inserted)) {
-            return false;
-        }
-        starts_.carryOut(std::move(edit));
-        return true;
-    });
 }
 
 void PageWriter::notePageStart()

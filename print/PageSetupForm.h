@@ -28,6 +28,9 @@ public:
     bool confirm();
 
 private:
+    static constexpr int hundredths = 100;                      ///< of a millimetre
+    static std::array<int, 4> inOrder(const QMargins &margins); ///< left, top, right, bottom
+
     void addPrinter(QVBoxLayout &layout);
     void addOrientation(QVBoxLayout &layout);
     void addMargins(QVBoxLayout &layout);

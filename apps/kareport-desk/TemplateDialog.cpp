@@ -3,10 +3,6 @@
 #include "Folders.h"
 #include "PlainWidgets.h"
 #include "Profile.h"
-#include "TemplateNames.h"
-#include "TemplateSource.h"
-#include "UXmlReportTpl.h"
-#include "WorkAside.h"
 #include "Xlate.h"
 
 #include <QComboBox>
@@ -20,9 +16,6 @@
 #include <QLineEdit>
 #include <QPushButton>
 #include <QVBoxLayout>
-
-#include <algorithm>
-#include <new>
 
 namespace kareport
 {
@@ -143,120 +136,6 @@ void TemplateDialog::browse(QLineEdit &field, const QString &title, const QStrin
     if (!path.isEmpty()) {
         field.setText(path);
     }
-}
-
-void TemplateDialog::readTemplates()
-{
-    const QString chosen = template_->currentData().toString();
-    template_->clear();
-    wrong_.clear();
-    if (!file_->text().isEmpty()) {
-        const auto file = readTemplateSource(file_->text());
-        if (const InputError *error = errorOf(file)) {
-            wrong_ = error->text;
-        } else {
-            for (const sXmlReportTemplateInfo &info : templateInfos(std::get<TemplateFile>(file))) {
-                template_->addItem(info.Title.isEmpty() ? info.Name : info.Name + QStringLiteral(" – ") + info.Title,
-                                   info.Name);
-            }
-            if (template_->count() == 0) {
-                wrong_ = whyNotLoaded(file_->text(), std::get<TemplateFile>(file), QString()).text;
-            }
-        }
-    }
-    template_->setCurrentIndex(qMax(template_->count() > 0 ? 0 : -1, template_->findData(chosen)));
-    readOutputs();
-}
-
-void TemplateDialog::readOutputs()
-{
-    const QString chosen = output_->currentText();
-    output_->clear();
-    UXmlReportTpl tpl;
-    if (template_->currentIndex() >= 0 && tpl.LoadTemplate(file_->text(), template_->currentData().toString())) {
-        QStringList names;
-        tpl.GetAllTables(names);
-        for (const QString &name : names) {
-            output_->addItem(name, false);
-        }
-        tpl.GetAllBlocks(names);
-        for (const QString &name : names) {
-            output_->addItem(name, true);
-        }
-    }
-    output_->setCurrentIndex(qMax(output_->count() > 0 ? 0 : -1, output_->findText(chosen)));
-    check();
-}
-
-/// Looks what the data file is.
-void TemplateDialog::readData()
-{
-    isLandXml_ = false;
-    wrongData_.clear();
-    const QString path = data_->text();
-    if (QFileInfo(path).isFile()) { // a pipe or a device might never end
-        const auto file = FileBytes::open(path);
-        if (const auto *opened = std::get_if<std::shared_ptr<const FileBytes>>(&file)) {
-            isLandXml_ = isLandXml(*opened) && readContents(*opened);
-        }
-    }
-    if (!isLandXml_) {
-        landXml_->clear();
-    }
-    check();
-    layout()->activate();
-    resize(width(), qMax(height(), sizeHint().height()));
-}
-
-/// Reads the names in a LandXML file. @return whether there is something to choose
-bool TemplateDialog::readContents(const std::shared_ptr<const FileBytes> &file)
-{
-    const auto read = std::make_shared<Expected<LandXmlContents>>();
-    const bool isDone = doAside(
-        Xlate("Reading %1").arg(QFileInfo(file->path()).fileName()), UserInput::Kept, [file, read](AsideState &state) {
-            const std::size_t size = std::max<std::size_t>(1, file->view().size());
-            try {
-                *read = readLandXmlContents(file, [&](std::size_t done) {
-                    state.setPercent(static_cast<int>(done * 100 / size));
-                    return !state.isStopped();
-                });
-            } catch (const std::bad_alloc &) {
-                *read = InputError{file->path(), std::nullopt, Xlate("there is not enough memory for it")};
-            }
-        });
-    if (!isDone) {
-        wrongData_ = Xlate("The data file was not read to its end.");
-        return false;
-    }
-    if (const InputError *error = errorOf(*read)) {
-        wrongData_ = error->message();
-        return false;
-    }
-    landXml_->offer(std::get<LandXmlContents>(*read));
-    if (!landXml_->hasList()) {
-        wrongData_ = Xlate("The data file holds nothing that is listed.");
-    }
-    return landXml_->hasList();
-}
-
-void TemplateDialog::check()
-{
-    QString message = wrong_;
-    if (message.isEmpty() && template_->currentIndex() >= 0 && output_->count() == 0) {
-        message = Xlate("This template has neither a table nor a block.");
-    }
-    if (message.isEmpty() && !data_->text().isEmpty() && !QFileInfo(data_->text()).isFile()) {
-        message = Xlate("There is no data file \"%1\".").arg(data_->text());
-    }
-    if (message.isEmpty()) {
-        message = wrongData_;
-    }
-    if (!message.isEmpty()) {
-        message[0] = message[0].toUpper(); // the error of a file is the end of a sentence
-    }
-    message_->setText(message);
-    buttons_->button(QDialogButtonBox::Ok)
-        ->setEnabled(message.isEmpty() && output_->currentIndex() >= 0 && !data_->text().isEmpty());
 }
 
 void TemplateDialog::accept()

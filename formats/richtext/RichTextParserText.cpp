@@ -211,4 +211,23 @@ void RichTextParser::breakPage()
     pageBreak_ = true;
 }
 
+void RichTextParser::readUnicode(int number)
+{
+    fallback_ = state_.fallbackCount;
+    if (number < 0) {
+        // Numbers are signed in the way of 16 bits.
+        number = number >= -0x8000 ? number + 0x10000 : int(QChar::ReplacementCharacter);
+    }
+    if (number > int(QChar::LastValidCodePoint)) {
+        number = int(QChar::ReplacementCharacter);
+    }
+    const auto code = static_cast<char32_t>(number);
+    if (QChar::requiresSurrogates(code)) {
+        put(QChar::highSurrogate(code));
+        put(QChar::lowSurrogate(code));
+        return;
+    }
+    put(static_cast<char16_t>(code));
+}
+
 } // namespace kareport

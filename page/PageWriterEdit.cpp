@@ -1,0 +1,57 @@
+#include "PageWriter.h"
+
+#include <utility>
+
+namespace kareport
+{
+
+void PageWriter::clear()
+{
+    text_.clear();
+    starts_.clear();
+    losses_ = 0;
+    lineCount_ = 0;
+    heading_.text.clear();
+    noteChange();
+}
+
+bool PageWriter::emptyIntoOutlet()
+{
+    bool isTaken = false;
+    losesNothing([&] { isTaken = text_.visit([this](auto text) { return outlet_->write(text); }); });
+    text_.drain();
+    starts_.clear();
+    return isTaken;
+}
+
+void PageWriter::exchangeText(ReportText &text, std::vector<qint64> pageStarts, qint64 lineEnds)
+{
+    text_.swap(text);
+    starts_.assign(std::move(pageStarts));
+    lineNumber_ += static_cast<int>(lineEnds);
+    lineCount_ += lineEnds;
+}
+
+bool PageWriter::replace(qint64 at, qint64 removed, QStringView inserted)
+{
+    if (at < 0 || removed < 0 || at > text_.size() || removed > text_.size() - at) {
+        return false;
+    }
+    return whileMemoryLasts(false, [&] {
+        if (text_.owns(inserted)) {
+            return replace(at, removed, inserted.toString());
+        }
+        const bool wantsRemoved = starts_.wantsRemoved(at, removed, inserted.size());
+        const QString removedText = wantsRemoved ? text_.piece(at, removed) : QString();
+        const bool mayBeHeader = inserted.size() > PageStarts::shortestHeader;
+        const bool beginsLine = at == 0 || (mayBeHeader && text_.piece(at - 1, 1) == u"\n");
+        PageStarts::Edit edit = starts_.prepare(at, removed, removedText, inserted, beginsLine);
+        if (!text_.replace(at, removed, inserted)) {
+            return false;
+        }
+        starts_.carryOut(std::move(edit));
+        return true;
+    });
+}
+
+} // namespace kareport
