@@ -130,7 +130,7 @@ std::optional<Output> readOutput(const JsonNode &node, const QDir &folder, std::
         node.fail(Xlate("the key \"file\" was expected"));
         return std::nullopt;
     }
-    const QString name = readFileName(file);
+    QString name = readFileName(file);
     const JsonNode as = node["as"];
     const auto kind = as.exists() ? outputKindFromName(as.text()) : outputKindOf(name, otherwise);
     if (!kind && as.exists()) {

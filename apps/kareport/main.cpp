@@ -378,19 +378,9 @@ int runProgram(int argc, char **argv)
     return exitUsage;
 }
 
-} // namespace
-
-int main(int argc, char **argv)
+/// Ends the program's output. @return the exit status
+int finish(int status)
 {
-    kareport::prepareProcess();
-    int status = 0;
-    try {
-        status = runProgram(argc, argv);
-    } catch (const std::bad_alloc &) {
-        // Without memory, no text can be put together either.
-        std::fputs("kareport: error: there is not enough memory for this input\n", stderr);
-        return kareport::exitInput;
-    }
     if (status == kareport::exitInterrupted) {
         kareport::endByInterrupt();
     }
@@ -402,4 +392,19 @@ int main(int argc, char **argv)
         return status == kareport::exitDone ? kareport::exitOutput : status;
     }
     return status;
+}
+
+} // namespace
+
+// NOLINTNEXTLINE(bugprone-exception-escape): what else is thrown is an error of the program, which ends it
+int main(int argc, char **argv)
+{
+    try {
+        kareport::prepareProcess();
+        return finish(runProgram(argc, argv));
+    } catch (const std::bad_alloc &) {
+        // Without memory, no text can be put together either.
+        std::fputs("kareport: error: there is not enough memory for this input\n", stderr);
+        return kareport::exitInput;
+    }
 }

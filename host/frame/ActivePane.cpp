@@ -25,8 +25,8 @@ kareport::RememberedView replaceActive(UView *&active, UView *view)
 {
     kareport::RememberedView before(active);
     active = view;
-    if (before.get() != nullptr && before.get() != view) {
-        before.get()->OnActivateView(false, view, before.get());
+    if (UView *left = before.get(); left != nullptr && left != view) {
+        left->OnActivateView(false, view, left);
     }
     return before;
 }

@@ -52,7 +52,7 @@ QString play(const std::vector<ReportStep> &steps, std::size_t *done = nullptr)
 {
     ModelledReports reports;
     for (std::size_t i = 0; i < steps.size(); ++i) {
-        const QString wrong = reports.carryOut(steps[i]);
+        QString wrong = reports.carryOut(steps[i]);
         if (!wrong.isEmpty()) {
             if (done != nullptr) {
                 *done = i + 1;
