@@ -38,7 +38,7 @@ struct CheckedFile
 /// Checks a template file.
 CheckedFile checkTemplateFile(const QString &file);
 
-/// Checks a job with its template, its data and its steps: the report is made and thrown away, in one pass over the data.
+/// Checks a job with its template, its data and its steps: the report is made and discarded, in one pass over the data.
 /// @param file       the name of the job in messages
 /// @param source     the job file, or why it could not be read
 /// @param isStrict   what the report notes is an error, also where the job does not say so

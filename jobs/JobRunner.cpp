@@ -36,7 +36,7 @@ QDateTime timeOf(const Job &job)
     return time ? *time : currentTime();
 }
 
-/// Lets the surroundings before a job hold again. The margins and the font size stay: the pages were made with them.
+/// Restores the surroundings that a report had before its job. Margins and font size stay: the pages were made with them.
 void putBack(UReportDoc &report, std::optional<ReportSurroundings> before)
 {
     if (before) {

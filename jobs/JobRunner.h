@@ -45,8 +45,8 @@ public:
     /// The notes on the report that was made last, also on one that was not finished.
     const JobNotes &notes() const { return notes_; }
 
-    /// Writes the job's report. Its surroundings are the job's until it has been written; then those that it had hold again,
-    /// but for margins and font size. Making it stops when it is larger than an output of the job may be.
+    /// Writes the job's report. Its surroundings are the job's until it has been written; then those that it had before
+    /// apply again, except for margins and font size. Writing stops when it is larger than an output of the job may be.
     /// @param report  a new one, which must stay open. In a program whose preferences must not matter it is made with
     ///                `surroundingsOf` the job
     /// @param stream  receives the text while it is written, where no step takes text back; null keeps it in the report.

@@ -14,8 +14,7 @@ namespace kareport
 /// The bytes that the report of a job has at least, as plain text. Lines of which the job says how many there are count: a
 /// short job can ask for very many. What its data becomes is not known before.
 qint64 leastSize(const Job &job);
-/// The same of a report that has been written in whole or in part: plain text does without every second character of a
-/// report that is all line ends.
+/// The bytes that a report has at least, as far as it has been written: a line end of it may become one byte.
 qint64 leastSize(const UReportDoc &report);
 
 /// The largest size that all outputs of a job may have; nothing when each may have any.

@@ -71,7 +71,7 @@ bool ReportText::replace(qint64 at, qint64 removed, QStringView inserted)
 /// it is too long for that or there is no memory
 bool ReportText::replaceLater(qint64 at, qint64 removed, QStringView inserted)
 {
-    // The room is got now: carrying the edits out later cannot fail.
+    // The memory is reserved now: carrying the edits out later cannot fail.
     const qint64 kept = size() - pending_.growth();
     if (inserted.size() > longestPending || !reserve(kept + pending_.inserted() + inserted.size()) ||
         !doneWhileMemoryLasts([&] { pending_.replace(at, removed, inserted); }))

@@ -23,7 +23,7 @@ struct ReportAccess
     /// Takes over a text that was made elsewhere, as on another thread, in a time that does not grow with it. Its lines are
     /// counted as if they had been written, and its pages begin where it says. Neither rich text nor a report window is
     /// notified of it.
-    /// @param text  is handed the text before it
+    /// @param text  receives the text before it
     static void takeText(UReportDoc &report, LoadedText &text);
 
     /// Sets what is written from now on is written with. With placeholders its pages have page marks.

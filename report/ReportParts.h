@@ -29,7 +29,7 @@ struct ReportParts
                             : reportPageDevice();
     }
 
-    std::optional<ReportSurroundings> surroundings; ///< nothing while those of the program hold
+    std::optional<ReportSurroundings> surroundings; ///< nothing while those of the program apply
     ReportHooks hooks;
 
     // Text and pages

@@ -52,7 +52,7 @@ public:
     ///                        owned and must outlive the report
     UReportDoc(const QString &name, bool externalEditor, bool closeDocument, UDocument *owner);
     UReportDoc();
-    /// A report with given surroundings, which hold until others are given.
+    /// A report with surroundings of its own, which apply until others are set.
     explicit UReportDoc(const kareport::ReportSurroundings &surroundings);
     ~UReportDoc() override;
 
@@ -63,11 +63,11 @@ public:
     /// Always false.
     bool IsThatDocId(const QString &) const;
 
-    /// Lets what is given hold for the report instead of the application's name, its clock, the default printer, the
-    /// user's preferences and the setting for wide values; margins and font size are taken over. Nothing lets the program's
-    /// own hold again: margins and font size then stay. Neither measures the page.
+    /// Gives the report surroundings of its own in place of the application's name, its clock, the default printer, the
+    /// user's preferences and the setting for wide values. Margins and font size are taken over. With no value the program's
+    /// own apply again; margins and font size then stay. The page is not measured.
     void SetSurroundings(const std::optional<kareport::ReportSurroundings> &surroundings);
-    /// What holds for the report instead; nothing while the program's own hold.
+    /// The report's own surroundings; nothing while those of the program apply.
     const std::optional<kareport::ReportSurroundings> &GetSurroundings() const;
 
     // --- Text: UReportDocText.cpp -----------------------------------------------------------------------------------
@@ -82,11 +82,11 @@ public:
     /// Whether a part of what was to be written, or set, since the last `Clear` is missing because memory ran out. Such a
     /// report is not saved, also when nothing is left of it.
     bool HasLostText() const;
-    /// Hands the text on to a writer while it is written, so that a report that only becomes a file may be longer than there
-    /// is memory: the document then holds no more than its end, and `Clear` does not take back what was handed on. Null
+    /// Passes the text to a writer while it is written, so that a report that only becomes a file may be longer than there
+    /// is memory: the document then holds no more than its end, and `Clear` does not take back what was passed on. Null
     /// keeps the text. The writer must live until `EndTextStream`, or until another one or null is set.
     void StreamText(kareport::ReportTextWriter *writer);
-    /// Hands the rest on, ends the writer's text and keeps the text from now on. @return whether the writer has all of it
+    /// Passes the rest to the writer, ends its text and keeps the text from now on. @return whether the writer has all of it
     bool EndTextStream(kareport::ReportTextWriter &writer);
     /// Replaces the text as it is. Counters stay, so what is written next continues the old pages. Where its pages begin is
     /// found by its page headers. Without memory for it the text is empty, and lost.
@@ -365,7 +365,7 @@ public:
     /// Why the last `OnSaveDocument` failed, as the end of a sentence; empty when it did not, or nothing is known.
     const QString &GetSaveProblem() const;
     /// Saves through `OnSaveDocument`. @return 0 for an empty path, else 1, whether the save succeeded or not: callers continue
-    /// either way. Who needs to know calls `OnSaveDocument`
+    /// either way. Callers that need to know call `OnSaveDocument`
     int SaveFile(const QString &path);
     /// Writes the text to an open device, in UTF-8. @return false as soon as a write fails
     bool WriteText(QIODevice &device, kareport::LineEnds lineEnds) const;

@@ -77,7 +77,7 @@ void DeskFrame::closeUnseen()
         if (isGivenUp || (!report->IsModified() && !wasEdited)) {
             report->OnCloseDocument();
         } else if (CViewPane *pane = report->GetFrameWindow()) {
-            pane->ShowPane(true); // what is not saved is not thrown away: closing this pane asks again
+            pane->ShowPane(true); // unsaved changes are not discarded: closing this pane asks again
         }
     }
 }

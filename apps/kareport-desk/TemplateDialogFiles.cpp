@@ -63,7 +63,7 @@ void TemplateDialog::readOutputs()
     check();
 }
 
-/// Looks what the data file is.
+/// Finds out what kind of file the data file is.
 void TemplateDialog::readData()
 {
     isLandXml_ = false;

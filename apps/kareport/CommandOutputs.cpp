@@ -56,7 +56,7 @@ ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, 
         if (result.isReaderGone) {
             progress.finish();
             endByClosedReader();
-            return exitOutput; // where the signal is switched off, no more of it is wanted either
+            return exitOutput; // where the signal is switched off, nothing more is written either
         }
         progress.finish();
         if (!result.isWritten() && isInterrupted()) {

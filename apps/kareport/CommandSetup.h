@@ -22,7 +22,7 @@ std::optional<QString> applySets(JsonSource &source, const QStringList &sets);
 /// Says what is wrong with the command line.
 ExitStatus usageExit(const QString &text);
 
-/// Starts Qt without a screen and catches interrupts. @param withFonts  whether fonts are needed: most jobs do without
+/// Starts Qt without a screen and catches interrupts. @param withFonts  whether fonts are needed: most jobs need none
 /// @return null, with nothing done, where the process has an application already
 std::unique_ptr<QCoreApplication> startQt(int &argc, char **argv, bool withFonts);
 
