@@ -18,7 +18,7 @@ namespace kareport
 class ReportText
 {
 public:
-    /// What memory is got with: `realloc`, or a test's own.
+    /// The function that allocates memory: `realloc`, or a test's own.
     using Reallocate = CharacterBlocks<char16_t>::Reallocate;
 
     static constexpr qint64 blockSize = CharacterBlocks<char16_t>::blockSize;

@@ -16,7 +16,7 @@ namespace kareport
 bool showsReport(const UView *view);
 /// The views that show a report's text, in their order.
 std::vector<UView *> reportViews(const UReportDoc &report);
-/// Lets the views of a report that load its text in pieces load the rest at once: a report that is saved has all of what is
+/// Lets the views of a report that load its text in pieces load the rest at once, so that all of it is
 /// saved. Where there is no memory for that, they go on in pieces.
 void finishLoading(const UReportDoc &report);
 

@@ -24,7 +24,7 @@ void RichTextParser::readWord(const RichTextToken &token, bool isStarred)
         return;
     }
     if (word == nullptr) {
-        // The mark says that who does not know the word leaves out the group. Before a word that is known and says nothing
+        // The mark says that a reader that does not know the word skips the group. Before a word that is known and says nothing
         // of its group, as that of a character style, it means nothing.
         if (isStarred) {
             skipGroup(nullptr);
