@@ -27,15 +27,15 @@ namespace
 {
 
 /// A kind of file that a save dialog offers.
-struct FileKind
+struct OfferedKind
 {
     QString title;   ///< as Qt shows it, with its pattern
     QString pattern; ///< "*" for all files
 };
 
-std::vector<FileKind> kindsOf(const QString &filter)
+std::vector<OfferedKind> kindsOf(const QString &filter)
 {
-    std::vector<FileKind> kinds;
+    std::vector<OfferedKind> kinds;
     const QStringList parts = filter.split(u'|', Qt::SkipEmptyParts);
     for (qsizetype i = 0; i + 1 < parts.size(); i += 2) {
         // The pattern after the title counts, not the one that the title shows. On this platform "*.*" would leave out
@@ -120,10 +120,10 @@ QString withEndingOf(const QString &path, const QString &kind, const QStringList
 
 std::optional<QString> askSavePath(QWidget *parent, const SaveRequest &request)
 {
-    const std::vector<FileKind> kinds = kindsOf(request.filter);
+    const std::vector<OfferedKind> kinds = kindsOf(request.filter);
     QStringList titles;
     QStringList patterns;
-    for (const FileKind &kind : kinds) {
+    for (const OfferedKind &kind : kinds) {
         titles.append(kind.title);
         patterns.append(kind.pattern);
     }
