@@ -436,101 +436,6 @@
     </message>
     <message>
         <location filename="../print/PageSetupForm.cpp"/>
-        <source>Pr&amp;inter:</source>
-        <translation>&amp;Drucker:</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Printer</source>
-        <translation>Drucker</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Pa&amp;per:</source>
-        <translation>Pa&amp;pier:</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Paper</source>
-        <translation>Papier</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Orientation</source>
-        <translation>Ausrichtung</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Margins</source>
-        <translation>Seitenränder</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>&amp;Left:</source>
-        <translation>&amp;Links:</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>&amp;Top:</source>
-        <translation>&amp;Oben:</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>&amp;Right:</source>
-        <translation>&amp;Rechts:</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>&amp;Bottom:</source>
-        <translation>&amp;Unten:</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Left margin</source>
-        <translation>Linker Rand</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Top margin</source>
-        <translation>Oberer Rand</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Right margin</source>
-        <translation>Rechter Rand</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Bottom margin</source>
-        <translation>Unterer Rand</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source> mm</source>
-        <translation> mm</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Pages</source>
-        <translation>Seiten</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Pages: %1</source>
-        <translation>Seiten: %1</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Each page of the report is printed on a sheet of its own, in smaller type where it has to be.</source>
-        <translation>Jede Seite des Berichts wird auf ein eigenes Blatt gedruckt, wo nötig in kleinerer Schrift.</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Each sheet takes as many lines as fit, and the next sheet goes on from there.</source>
-        <translation>Jedes Blatt nimmt so viele Zeilen auf, wie darauf passen, und das nächste fährt dort fort.</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
         <source>Paper: %1 x %2 mm</source>
         <translation>Papier: %1 x %2 mm</translation>
     </message>
@@ -538,6 +443,101 @@
         <location filename="../print/PageSetupForm.cpp"/>
         <source>These margins leave no room for text on the paper. Choose smaller margins.</source>
         <translation>Diese Ränder lassen auf dem Papier keinen Platz für Text. Bitte kleinere Ränder wählen.</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Pr&amp;inter:</source>
+        <translation>&amp;Drucker:</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Printer</source>
+        <translation>Drucker</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Pa&amp;per:</source>
+        <translation>Pa&amp;pier:</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Paper</source>
+        <translation>Papier</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Orientation</source>
+        <translation>Ausrichtung</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Margins</source>
+        <translation>Seitenränder</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>&amp;Left:</source>
+        <translation>&amp;Links:</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>&amp;Top:</source>
+        <translation>&amp;Oben:</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>&amp;Right:</source>
+        <translation>&amp;Rechts:</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>&amp;Bottom:</source>
+        <translation>&amp;Unten:</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Left margin</source>
+        <translation>Linker Rand</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Top margin</source>
+        <translation>Oberer Rand</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Right margin</source>
+        <translation>Rechter Rand</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Bottom margin</source>
+        <translation>Unterer Rand</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source> mm</source>
+        <translation> mm</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Pages</source>
+        <translation>Seiten</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Pages: %1</source>
+        <translation>Seiten: %1</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Each page of the report is printed on a sheet of its own, in smaller type where it has to be.</source>
+        <translation>Jede Seite des Berichts wird auf ein eigenes Blatt gedruckt, wo nötig in kleinerer Schrift.</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Each sheet takes as many lines as fit, and the next sheet goes on from there.</source>
+        <translation>Jedes Blatt nimmt so viele Zeilen auf, wie darauf passen, und das nächste fährt dort fort.</translation>
     </message>
     <message>
         <location filename="../print/PrintDialogs.cpp"/>
@@ -3115,22 +3115,22 @@ Sollen sie wieder geöffnet werden?</translation>
         <translation>Daten (*.csv *.txt *.xml *.landxml);;Alle Dateien (*)</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <location filename="../apps/kareport-desk/TemplateDialogFiles.cpp"/>
         <source>The data file was not read to its end.</source>
         <translation>Die Datendatei wurde nicht zu Ende gelesen.</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <location filename="../apps/kareport-desk/TemplateDialogFiles.cpp"/>
         <source>The data file holds nothing that is listed.</source>
         <translation>Die Datendatei enthält nichts, was aufgelistet wird.</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <location filename="../apps/kareport-desk/TemplateDialogFiles.cpp"/>
         <source>This template has neither a table nor a block.</source>
         <translation>Diese Vorlage hat weder eine Tabelle noch einen Block.</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <location filename="../apps/kareport-desk/TemplateDialogFiles.cpp"/>
         <source>There is no data file "%1".</source>
         <translation>Es gibt keine Datendatei „%1“.</translation>
     </message>

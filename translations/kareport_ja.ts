@@ -436,101 +436,6 @@
     </message>
     <message>
         <location filename="../print/PageSetupForm.cpp"/>
-        <source>Pr&amp;inter:</source>
-        <translation>プリンター(&amp;P):</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Printer</source>
-        <translation>プリンター</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Pa&amp;per:</source>
-        <translation>用紙(&amp;Z):</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Paper</source>
-        <translation>用紙</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Orientation</source>
-        <translation>印刷の向き</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Margins</source>
-        <translation>余白</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>&amp;Left:</source>
-        <translation>左(&amp;L):</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>&amp;Top:</source>
-        <translation>上(&amp;T):</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>&amp;Right:</source>
-        <translation>右(&amp;R):</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>&amp;Bottom:</source>
-        <translation>下(&amp;B):</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Left margin</source>
-        <translation>左余白</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Top margin</source>
-        <translation>上余白</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Right margin</source>
-        <translation>右余白</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Bottom margin</source>
-        <translation>下余白</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source> mm</source>
-        <translation> mm</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Pages</source>
-        <translation>ページ数</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Pages: %1</source>
-        <translation>ページ: %1</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Each page of the report is printed on a sheet of its own, in smaller type where it has to be.</source>
-        <translation>レポートの各ページを 1 枚ずつの用紙に印刷します。入りきらない場合は文字を小さくします。</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
-        <source>Each sheet takes as many lines as fit, and the next sheet goes on from there.</source>
-        <translation>各用紙に入るだけの行を印刷し、続きを次の用紙に印刷します。</translation>
-    </message>
-    <message>
-        <location filename="../print/PageSetupForm.cpp"/>
         <source>Paper: %1 x %2 mm</source>
         <translation>用紙: %1 x %2 mm</translation>
     </message>
@@ -538,6 +443,101 @@
         <location filename="../print/PageSetupForm.cpp"/>
         <source>These margins leave no room for text on the paper. Choose smaller margins.</source>
         <translation>余白が大きく、用紙に印字できる範囲がありません。余白を小さくしてください。</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Pr&amp;inter:</source>
+        <translation>プリンター(&amp;P):</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Printer</source>
+        <translation>プリンター</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Pa&amp;per:</source>
+        <translation>用紙(&amp;Z):</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Paper</source>
+        <translation>用紙</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Orientation</source>
+        <translation>印刷の向き</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Margins</source>
+        <translation>余白</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>&amp;Left:</source>
+        <translation>左(&amp;L):</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>&amp;Top:</source>
+        <translation>上(&amp;T):</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>&amp;Right:</source>
+        <translation>右(&amp;R):</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>&amp;Bottom:</source>
+        <translation>下(&amp;B):</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Left margin</source>
+        <translation>左余白</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Top margin</source>
+        <translation>上余白</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Right margin</source>
+        <translation>右余白</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Bottom margin</source>
+        <translation>下余白</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source> mm</source>
+        <translation> mm</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Pages</source>
+        <translation>ページ数</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Pages: %1</source>
+        <translation>ページ: %1</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Each page of the report is printed on a sheet of its own, in smaller type where it has to be.</source>
+        <translation>レポートの各ページを 1 枚ずつの用紙に印刷します。入りきらない場合は文字を小さくします。</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source>Each sheet takes as many lines as fit, and the next sheet goes on from there.</source>
+        <translation>各用紙に入るだけの行を印刷し、続きを次の用紙に印刷します。</translation>
     </message>
     <message>
         <location filename="../print/PrintDialogs.cpp"/>
@@ -3115,22 +3115,22 @@ Open them again?</source>
         <translation>データ (*.csv *.txt *.xml *.landxml);;すべてのファイル (*)</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <location filename="../apps/kareport-desk/TemplateDialogFiles.cpp"/>
         <source>The data file was not read to its end.</source>
         <translation>データファイルは最後まで読み込まれませんでした。</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <location filename="../apps/kareport-desk/TemplateDialogFiles.cpp"/>
         <source>The data file holds nothing that is listed.</source>
         <translation>データファイルに一覧にできるものがありません。</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <location filename="../apps/kareport-desk/TemplateDialogFiles.cpp"/>
         <source>This template has neither a table nor a block.</source>
         <translation>このテンプレートには表もブロックもありません。</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <location filename="../apps/kareport-desk/TemplateDialogFiles.cpp"/>
         <source>There is no data file "%1".</source>
         <translation>データファイル「%1」がありません。</translation>
     </message>
