@@ -40,7 +40,7 @@ std::optional<ColumnFault> bindDatabaseColumns(ColumnBinding &binding, std::vect
     }
     if (binding.fields().empty()) {
         return ColumnFault{std::nullopt, QString(),
-                           Xlate("no column is a variable of the dictionary: there are %1")
+                           Xlate("no column is a variable of the dictionary; the columns are: %1")
                                .arg(namesOf(columns).join(QStringLiteral(", ")))};
     }
     for (const BoundField &field : binding.fields()) {

@@ -967,8 +967,8 @@
     </message>
     <message>
         <location filename="../sources/GeometryColumns.cpp"/>
-        <source>no column is a variable of the dictionary: there are %1</source>
-        <translation>keine Spalte ist eine Variable des Wörterbuchs: vorhanden sind %1</translation>
+        <source>no column is a variable of the dictionary; the columns are: %1</source>
+        <translation>keine Spalte ist eine Variable des Wörterbuchs; die Spalten sind: %1</translation>
     </message>
     <message>
         <location filename="../sources/PointGeometry.cpp"/>
@@ -1278,8 +1278,8 @@
     </message>
     <message>
         <location filename="../sources/json/JsonKeys.cpp"/>
-        <source>no key of the objects is a variable of the dictionary: there are %1</source>
-        <translation>kein Schlüssel der Objekte ist eine Variable des Wörterbuchs: vorhanden sind %1</translation>
+        <source>no key of the objects is a variable of the dictionary; the keys are: %1</source>
+        <translation>kein Schlüssel der Objekte ist eine Variable des Wörterbuchs; die Schlüssel sind: %1</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlComparison.cpp"/>
@@ -1308,18 +1308,18 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element winds round too often</source>
-        <translation>das Element windet sich zu oft im Kreis</translation>
+        <source>the element turns too many times</source>
+        <translation>das Element dreht sich zu oft im Kreis</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element leaves its tangent by more than 45 degrees, which its form cannot</source>
-        <translation>das Element weicht um mehr als 45 Grad von seiner Tangente ab, was seine Form nicht kann</translation>
+        <source>the element turns by more than 45 degrees from its tangent: its form allows less</source>
+        <translation>das Element dreht um mehr als 45 Grad von seiner Tangente ab: seine Form lässt weniger zu</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element is curved at both ends, which its form cannot be: a straight end was expected</source>
-        <translation>das Element ist an beiden Enden gekrümmt, was seine Form nicht kann: ein gerades Ende wurde erwartet</translation>
+        <source>the element is curved at both ends: its form needs a straight end</source>
+        <translation>das Element ist an beiden Enden gekrümmt: seine Form braucht ein gerades Ende</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
@@ -1473,8 +1473,8 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlRoute.cpp"/>
-        <source>the elements wind round too often</source>
-        <translation>die Elemente winden sich zu oft im Kreis</translation>
+        <source>the elements turn too many times</source>
+        <translation>die Elemente drehen sich zu oft im Kreis</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlRoute.cpp"/>
@@ -1588,8 +1588,8 @@
     </message>
     <message>
         <location filename="../sources/landxml/StationRows.cpp"/>
-        <source>the line at the offset %1 reaches the centre of the element, whose radius is %2, and turns back there</source>
-        <translation>die Linie im Abstand %1 erreicht den Mittelpunkt des Elements mit dem Halbmesser %2 und kehrt dort um</translation>
+        <source>the line at the offset %1 does not run forward here: the radius of the element is %2</source>
+        <translation>die Linie im Abstand %1 läuft hier nicht vorwärts: der Halbmesser des Elements ist %2</translation>
     </message>
     <message>
         <location filename="../sources/landxml/XmlStream.cpp"/>

@@ -967,8 +967,8 @@
     </message>
     <message>
         <location filename="../sources/GeometryColumns.cpp"/>
-        <source>no column is a variable of the dictionary: there are %1</source>
-        <translation>辞書の変数である列がありません: あるのは %1 です</translation>
+        <source>no column is a variable of the dictionary; the columns are: %1</source>
+        <translation>辞書の変数である列がありません。列は次のとおりです: %1</translation>
     </message>
     <message>
         <location filename="../sources/PointGeometry.cpp"/>
@@ -1278,8 +1278,8 @@
     </message>
     <message>
         <location filename="../sources/json/JsonKeys.cpp"/>
-        <source>no key of the objects is a variable of the dictionary: there are %1</source>
-        <translation>辞書の変数であるキーがオブジェクトにありません: あるのは %1 です</translation>
+        <source>no key of the objects is a variable of the dictionary; the keys are: %1</source>
+        <translation>辞書の変数であるキーがオブジェクトにありません。キーは次のとおりです: %1</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlComparison.cpp"/>
@@ -1308,17 +1308,17 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element winds round too often</source>
+        <source>the element turns too many times</source>
         <translation>要素の周回数が多すぎます</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element leaves its tangent by more than 45 degrees, which its form cannot</source>
+        <source>the element turns by more than 45 degrees from its tangent: its form allows less</source>
         <translation>要素が接線から 45 度を超えて離れており、この曲線形では表せません</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element is curved at both ends, which its form cannot be: a straight end was expected</source>
+        <source>the element is curved at both ends: its form needs a straight end</source>
         <translation>要素の両端が曲がっており、この曲線形では表せません: 一方の端は直線である必要があります</translation>
     </message>
     <message>
@@ -1473,7 +1473,7 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlRoute.cpp"/>
-        <source>the elements wind round too often</source>
+        <source>the elements turn too many times</source>
         <translation>要素の周回数の合計が多すぎます</translation>
     </message>
     <message>
@@ -1588,8 +1588,8 @@
     </message>
     <message>
         <location filename="../sources/landxml/StationRows.cpp"/>
-        <source>the line at the offset %1 reaches the centre of the element, whose radius is %2, and turns back there</source>
-        <translation>オフセット %1 の線は半径 %2 の要素の中心に達し、そこで折り返します</translation>
+        <source>the line at the offset %1 does not run forward here: the radius of the element is %2</source>
+        <translation>オフセット %1 の線はここで前方に進みません: 要素の半径は %2 です</translation>
     </message>
     <message>
         <location filename="../sources/landxml/XmlStream.cpp"/>

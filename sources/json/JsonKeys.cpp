@@ -103,7 +103,7 @@ std::optional<QString> JsonKeys::whatIsMissing(const std::vector<SourceColumn> &
         return std::nullopt;
     }
     constexpr qsizetype mostNames = 40;
-    return Xlate("no key of the objects is a variable of the dictionary: there are %1")
+    return Xlate("no key of the objects is a variable of the dictionary; the keys are: %1")
         .arg(names.isEmpty() ? Xlate("none") : names.mid(0, mostNames).join(QStringLiteral(", ")));
 }
 

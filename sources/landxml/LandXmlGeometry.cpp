@@ -56,11 +56,10 @@ QString textOf(CurveFault fault)
     switch (fault) {
     case CurveFault::NotFinite: return Xlate("the element has no geometry: a radius above zero was expected");
     case CurveFault::NoLength: return Xlate("the element has no geometry: a length above zero was expected");
-    case CurveFault::TooManyTurns: return Xlate("the element winds round too often");
+    case CurveFault::TooManyTurns: return Xlate("the element turns too many times");
     case CurveFault::TooSteep:
-        return Xlate("the element leaves its tangent by more than 45 degrees, which its form cannot");
-    case CurveFault::NoStraightEnd:
-        return Xlate("the element is curved at both ends, which its form cannot be: a straight end was expected");
+        return Xlate("the element turns by more than 45 degrees from its tangent: its form allows less");
+    case CurveFault::NoStraightEnd: return Xlate("the element is curved at both ends: its form needs a straight end");
     }
     return {};
 }

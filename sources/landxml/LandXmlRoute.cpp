@@ -107,7 +107,7 @@ private:
         route_.pieces.push_back(std::move(piece));
     }
 
-    static QString windsTooOften() { return Xlate("the elements wind round too often"); }
+    static QString windsTooOften() { return Xlate("the elements turn too many times"); }
 
     static bool endsWhereItStarts(const LandXmlElement &element)
     {

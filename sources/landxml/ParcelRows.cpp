@@ -76,7 +76,7 @@ ParcelBorder BorderRows::borderOf(const LandXmlParcel &parcel, LandXmlComparison
             // A small file can hold curves whose area would take minutes. Those of real borders do not wind at all.
             const std::size_t pieces = curve.isLine() || curve.pieces() == 1 ? 0 : curve.pieces();
             if (pieces > budget_) {
-                fail(parcel.byte, Xlate("the elements wind round too often"));
+                fail(parcel.byte, Xlate("the elements turn too many times"));
                 return border;
             }
             budget_ -= pieces;

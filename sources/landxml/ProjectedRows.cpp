@@ -129,7 +129,7 @@ bool ProjectedRows::checkElements()
         pieces += element.curve.pieces() - std::min(usualPieces, element.curve.pieces());
     }
     if (pieces > mostPieces) {
-        fail(route_->stored->byte, Xlate("the elements wind round too often"));
+        fail(route_->stored->byte, Xlate("the elements turn too many times"));
         return false;
     }
     return true;

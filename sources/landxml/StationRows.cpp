@@ -179,8 +179,8 @@ void StationRows::noteOffsetsPastCentres(const LandXmlRoute &route)
                 if (line.offset * curvature >= 1) {
                     modelNotes_.add(
                         route.stored->elements[piece.element].byte,
-                        Xlate("the line at the offset %1 reaches the centre of the element, whose radius is "
-                              "%2, and turns back there")
+                        Xlate("the line at the offset %1 does not run forward here: the radius of the element is "
+                              "%2")
                             .arg(length(line.offset), length(radiusOf(curvature))));
                 }
             }

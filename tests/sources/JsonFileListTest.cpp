@@ -46,7 +46,7 @@ TEST(JsonFileList, ReadsListsAndLines)
         {R"({"Number":"1"})", "number=1", "one object"},
         {"[]", "", "no object"},
         {" [ \n ] ", "", "no object"},
-        {"[{}]", "\nerror no key of the objects is a variable of the dictionary: there are none",
+        {"[{}]", "\nerror no key of the objects is a variable of the dictionary; the keys are: none",
          "an object without a key"},
         {R"([{"number":1},{"NUMBER":2}])", "number=1\nnumber=2", "keys in any case"},
         {R"([{"Number":1,"Code":{"a":[1,{"Northing":7}]},"More":[{"Northing":3},"]}"]}])", "number=1",
@@ -150,7 +150,7 @@ TEST(JsonFileList, EveryMistakeHasItsPlace)
         {"{\"Code\":" + QByteArray("[").repeated(100000) + "}",
          "error 1:100009 this is not JSON: ", "lists in a value"},
         {"{\"Code\":1}\n{\"Kind\":1}",
-         "\n\nerror no key of the objects is a variable of the dictionary: there are Code, Kind", "no variable"},
+         "\n\nerror no key of the objects is a variable of the dictionary; the keys are: Code, Kind", "no variable"},
     };
     for (const Row &row : rows) {
         EXPECT_TRUE(rowsOf(row.text).starts_with(row.expected))

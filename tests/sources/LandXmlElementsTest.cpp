@@ -231,7 +231,7 @@ TEST(LandXmlElements, WithoutGeometryAreListedAndSaid)
         {"<Spiral rot='cw' spiType='clothoid' radiusStart='INF' radiusEnd='50'>" + ends + "</Spiral>", "length",
          "no length"},
         {"<Spiral length='1e9' rot='cw' spiType='clothoid' radiusStart='INF' radiusEnd='0.001'>" + ends + "</Spiral>",
-         "winds round", "a coil"},
+         "turns too many times", "a coil"},
         {"<Spiral length='10' rot='cw' spiType='cubicParabola' radiusStart='10' radiusEnd='5'>" + ends + "</Spiral>",
          "curved at both ends", "a form that begins at a tangent"},
         {"<Spiral length='100' rot='cw' spiType='cubicParabola' radiusStart='INF' radiusEnd='5'>" + ends + "</Spiral>",

@@ -103,7 +103,7 @@ TEST(LandXmlHostile, ElementsThatWindRoundWithoutEndAreRefused)
         LandXmlFile file(fileOf(alignment(elements)), queryOf(kind));
         EXPECT_EQ(file.rows(), QStringList());
         ASSERT_TRUE(file.list->error());
-        EXPECT_TRUE(file.list->error()->text.contains(u"wind round too often"));
+        EXPECT_TRUE(file.list->error()->text.contains(u"turn too many times"));
     }
     LandXmlFile parcels(fileOf("<Parcels><Parcel><CoordGeom>" + elements + "</CoordGeom></Parcel></Parcels>"),
                         queryOf(Kind::Parcels));
@@ -177,7 +177,7 @@ TEST(LandXmlHostile, PointsAreNotProjectedOntoCoils)
                               "<Start>0 0</Start><End>1 1</End></Spiral>";
     LandXmlFile coil(fileOf(points + alignment(spiral)), queryOf(Kind::OffsetsOf));
     EXPECT_EQ(coil.rows(), QStringList());
-    EXPECT_TRUE(coil.list->error() && coil.list->error()->text.contains(u"wind round too often"));
+    EXPECT_TRUE(coil.list->error() && coil.list->error()->text.contains(u"turn too many times"));
     const QByteArray ramp =
         "<Curve rot='cw' length='2000'><Start>0 0</Start><Center>0 50</Center><End>0.001 0</End></Curve>";
     LandXmlFile turns(fileOf(points + alignment(ramp)), queryOf(Kind::OffsetsOf), {QStringLiteral("Offset")});

@@ -372,11 +372,12 @@ TEST(LandXmlStations, ALineThatReachesTheCentreOfAnElementIsNoted)
     query.offsets = {{99.9, std::nullopt}, {100, std::nullopt}, {150, std::nullopt}, {-150, std::nullopt}};
     LandXmlFile file(fileOf(alignment(bend())), query, {QStringLiteral("Station")});
     EXPECT_EQ(file.rows().size(), 4);
-    EXPECT_EQ(file.notes(),
-              QStringList({u"6:1: the line at the offset 100.000 reaches the centre of the element, whose radius is "
-                           "100.000, and turns back there"_qs,
-                           u"6:1: the line at the offset 150.000 reaches the centre of the element, whose radius is "
-                           "100.000, and turns back there"_qs}))
+    EXPECT_EQ(
+        file.notes(),
+        QStringList({u"6:1: the line at the offset 100.000 does not run forward here: the radius of the element is "
+                     "100.000"_qs,
+                     u"6:1: the line at the offset 150.000 does not run forward here: the radius of the element is "
+                     "100.000"_qs}))
         << "on the inner side alone";
     const PlaneCurve left = curve(TransitionForm::Clothoid, {0, 0}, 0, 60, 0, -1 / 50.0);
     query.offsets = {{-60, std::nullopt}, {60, std::nullopt}};

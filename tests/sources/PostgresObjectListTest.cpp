@@ -150,7 +150,7 @@ TEST_F(PostgresServer, SaysWhatIsWrong)
          "the same in disguise"},
         {"SELECT nextval('kept_seq') AS number",
          "error the database does not answer the query: relation \"kept_seq\" does not exist", "no sequence"},
-        {"SELECT 1 AS other", "error no column is a variable of the dictionary: there are other", "no variable"},
+        {"SELECT 1 AS other", "error no column is a variable of the dictionary; the columns are: other", "no variable"},
         {"SELECT 1 AS number, 2 AS number", "error the columns 1 and 2 are both named \"number\"", "a variable twice"},
         {"SELECT i AS number, 1 / (3 - i) AS count FROM generate_series(1, 9) i",
          "number=1 count=0\nnumber=2 count=1\nerror the database does not answer the query: division by zero",

@@ -1,6 +1,7 @@
 #include "PostgresObjectList.h"
 #include "SurveyRows.h"
 
+#include <QElapsedTimer>
 #include <QTemporaryDir>
 
 #include <sys/socket.h>

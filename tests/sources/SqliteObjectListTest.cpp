@@ -237,7 +237,7 @@ TEST(SqliteObjectList, SaysWhatIsWrong)
         {database.table("point"), "the database has no table \"point\": did you mean \"points\"?", "a misspelt table"},
         {database.table("survey"), "the database has no table \"survey\": one of other, points was expected",
          "another table"},
-        {database.table("other"), "no column is a variable of the dictionary: there are a", "no variable"},
+        {database.table("other"), "no column is a variable of the dictionary; the columns are: a", "no variable"},
         {database.table("points", {{"Elev", 1}}),
          "the dictionary has no variable \"Elev\": did you mean \"Elevation\"?", "no variable"},
         {database.table("points", {{"Elevation", QStringLiteral("Northng")}}),
