@@ -108,8 +108,8 @@ void readManyFormats(benchmark::State &state)
         bytes += "{\\f" + number + " F" + number + ";}";
         // Tab stops are limited to the width of a page.
         lines += i == 0 ? "" : "\\par";
-        lines += "\\pard\\tx" + QByteArray::number(i % 300) + "\\tx" + QByteArray::number(15 * (i / 300)) + "\\f" +
-                 number + " x";
+        lines += "\\pard\\tx" + QByteArray::number(i % 300) + "\\tx" + QByteArray::number(300 + 15 * (i / 300)) +
+                 "\\f" + number + " x";
     }
     read(state, bytes + "}" + lines + "}");
 }

@@ -123,10 +123,11 @@ TEST(RichTextFormat, ManyFormatsAreKeptApart)
         fonts += "{\\f" + number + " F" + number + ";}";
         text += "\\f" + number + " x";
         // Tab stops are limited to the width of a page.
-        tabs += "\\pard\\tx" + QByteArray::number(i % 300) + "\\tx" + QByteArray::number(15 * (i / 300)) + " x\\par";
+        tabs +=
+            "\\pard\\tx" + QByteArray::number(i % 300) + "\\tx" + QByteArray::number(300 + 15 * (i / 300)) + " x\\par";
     }
     EXPECT_TRUE(shown(fonts + "}" + text + "}").endsWith(QStringLiteral("<F5999>x")));
-    EXPECT_TRUE(shown(tabs + "}").endsWith(QStringLiteral("[tab0:19 tab0:19.9333]x")));
+    EXPECT_TRUE(shown(tabs + "}").endsWith(QStringLiteral("[tab0:19.9333 tab0:39]x")));
 }
 
 } // namespace
