@@ -8,6 +8,9 @@ namespace
 
 constexpr double halfCircle = std::numbers::pi;
 
+// Points of a half circle whose last digits are rounded may be a little more than the diameter from each other.
+constexpr double rounding = 1e-6;
+
 FittedCurve arcOfTurn(PlanePoint centre, PlanePoint start, double turn, bool isRight)
 {
     const double radius = distanceBetween(centre, start);
@@ -40,11 +43,22 @@ FittedCurve arcAbout(PlanePoint centre, PlanePoint start, double length, bool is
     return arcOfTurn(centre, start, length / distanceBetween(centre, start), isRight);
 }
 
+FittedCurve arcOver(PlanePoint start, PlanePoint end, double radius, bool isRight, bool isLong)
+{
+    const double chord = distanceBetween(start, end);
+    if (!(radius > 0) || !std::isfinite(radius) || chord > 2 * radius * (1 + rounding)) {
+        return CurveFault::NotFinite;
+    }
+    const double shortTurn = 2 * std::asin(std::min(1.0, chord / 2 / radius));
+    const double turn = isLong ? 2 * halfCircle - shortTurn : shortTurn;
+    const double side = isRight ? 1 : -1;
+    return PlaneCurve::make(TransitionForm::Clothoid, start, bearingBetween(start, end) - side * turn / 2,
+                            chord > 0 ? radius * turn : 0, side / radius, side / radius);
+}
+
 std::optional<PlanePoint> centreOfArc(PlanePoint start, PlanePoint end, double radius, bool isRight, bool isLong)
 {
     const double chord = distanceBetween(start, end);
-    // Points of a half circle whose last digits are rounded may be a little more than the diameter from each other.
-    constexpr double rounding = 1e-6;
     if (!(chord > 0) || !(radius > 0) || chord > 2 * radius * (1 + rounding)) {
         return std::nullopt;
     }

@@ -18,6 +18,10 @@ FittedCurve lineBetween(PlanePoint start, PlanePoint end);
 FittedCurve arcAbout(PlanePoint centre, PlanePoint start, PlanePoint end, bool isRight);
 /// The arc about a centre of a length.
 FittedCurve arcAbout(PlanePoint centre, PlanePoint start, double length, bool isRight);
+/// The arc of a radius between two points. It does not need the centre, whose digits are too few for the angle where it is
+/// far away. A fault where the points are the same, or too far from each other for the radius.
+/// @param isLong  the arc is longer than half a circle
+FittedCurve arcOver(PlanePoint start, PlanePoint end, double radius, bool isRight, bool isLong);
 /// The centre of an arc of a radius between two points, which lies to the right or to the left of the way from start to
 /// end. Nothing when the points are the same, or too far from each other for the radius.
 /// @param isLong  the arc is longer than half a circle: its centre is then on the other side of the chord

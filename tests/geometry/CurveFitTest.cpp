@@ -2,6 +2,8 @@
 
 #include <gtest/gtest.h>
 
+#include <limits>
+
 namespace
 {
 
@@ -102,6 +104,40 @@ TEST(CurveFit, OnlyArcsHaveACentre)
 {
     EXPECT_FALSE(centreOf(curveIn(lineBetween({0, 0}, {1, 0}))));
     EXPECT_FALSE(centreOf(curveIn(PlaneCurve::make(TransitionForm::Bloss, {}, 0, 10, 0, 0.1))));
+}
+
+TEST(CurveFit, AnArcOverItsEndsNeedsNoCentre)
+{
+    struct Row
+    {
+        bool isRight;
+        bool isLong;
+    };
+    for (const Row row : {Row{true, false}, Row{false, false}, Row{true, true}, Row{false, true}}) {
+        const PlanePoint start{1000, 2000};
+        const PlanePoint end{1006, 2000};
+        const auto centre = centreOfArc(start, end, 5, row.isRight, row.isLong);
+        ASSERT_TRUE(centre);
+        const auto expected = std::get<PlaneCurve>(arcAbout(*centre, start, end, row.isRight));
+        const auto arc = std::get<PlaneCurve>(arcOver(start, end, 5, row.isRight, row.isLong));
+        EXPECT_NEAR(arc.length(), expected.length(), 1e-9);
+        EXPECT_NEAR(turnBetween(arc.start().bearing, expected.start().bearing), 0, 1e-9);
+        EXPECT_NEAR(arc.startCurvature(), expected.startCurvature(), 1e-12);
+        EXPECT_LT(distanceBetween(arc.end().point, end), 1e-9);
+    }
+    // Far away, a centre has too few digits to tell the angle.
+    for (const double radius : {3e9, 1e12, 1e15}) {
+        const auto arc = std::get<PlaneCurve>(arcOver({5516000, 3512000}, {5516300, 3512400}, radius, true, false));
+        EXPECT_NEAR(arc.length(), 500, 1e-9) << radius;
+        EXPECT_LT(distanceBetween(arc.end().point, {5516300, 3512400}), 1e-8) << radius;
+        EXPECT_NEAR(arc.turnTo(arc.length()), 500 / radius, 1e-15 * 500 / radius * 10) << radius;
+    }
+    EXPECT_TRUE(std::holds_alternative<CurveFault>(arcOver({0, 0}, {6, 0}, 2.9, true, false)));
+    EXPECT_TRUE(std::holds_alternative<CurveFault>(arcOver({1, 1}, {1, 1}, 5, true, false)));
+    EXPECT_TRUE(std::holds_alternative<CurveFault>(
+        arcOver({0, 0}, {6, 0}, std::numeric_limits<double>::infinity(), true, false)));
+    EXPECT_TRUE(std::holds_alternative<PlaneCurve>(arcOver({0, 0}, {6.000001, 0}, 3, true, false)))
+        << "half a circle of rounded points";
 }
 
 } // namespace
