@@ -90,12 +90,18 @@ void readNamed(const std::shared_ptr<const FileBytes> &file, std::size_t size)
     ask(Kind::Points, contents->groups, &LandXmlQuery::name);
     ask(Kind::SurfacePoints, contents->surfaces, &LandXmlQuery::name);
     ask(Kind::Courses, contents->parcels, &LandXmlQuery::name);
-    ask(Kind::Elements, contents->alignments, &LandXmlQuery::name);
-    ask(Kind::OffsetsOf, contents->alignments, &LandXmlQuery::alignment);
-    ask(Kind::Stations, contents->gradeLines, &LandXmlQuery::gradeLine);
-    ask(Kind::Profile, contents->gradeLines, &LandXmlQuery::gradeLine);
-    ask(Kind::Stations, contents->surfaceLines, &LandXmlQuery::surface);
-    ask(Kind::CrossSections, contents->surfaceLines, &LandXmlQuery::surface);
+    if (contents->alignments.empty()) {
+        return;
+    }
+    for (const LandXmlContents::Alignment *alignment : {&contents->alignments.front(), &contents->alignments.back()}) {
+        const std::vector<LandXmlNamed> itself = {{alignment->name, alignment->elements}};
+        ask(Kind::Elements, itself, &LandXmlQuery::name);
+        ask(Kind::OffsetsOf, itself, &LandXmlQuery::alignment);
+        ask(Kind::Stations, alignment->gradeLines, &LandXmlQuery::gradeLine);
+        ask(Kind::Profile, alignment->gradeLines, &LandXmlQuery::gradeLine);
+        ask(Kind::Stations, alignment->surfacesAlong, &LandXmlQuery::surface);
+        ask(Kind::CrossSections, alignment->surfacesAcross, &LandXmlQuery::surface);
+    }
 }
 
 } // namespace

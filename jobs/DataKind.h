@@ -8,6 +8,7 @@
 #include "JsonSource.h"
 #include "Progress.h"
 #include "RowList.h"
+#include "UJobSettings.h"
 
 #include <QDir>
 #include <QString>
@@ -27,8 +28,9 @@ struct DataRequest
     JsonPath path;            ///< of the data set in the job
     /// The variables that are wanted, for numbers in the given units.
     std::function<Variables(const DataUnits &)> variablesIn;
-    DataUnits units; ///< those that the job says, or else the defaults
-    bool firstOnly;  ///< one row is enough where the others cost nothing to leave out
+    DataUnits units;              ///< those that the job says, or else the defaults
+    bool firstOnly;               ///< one row is enough where the others cost nothing to leave out
+    const UJobSettings &settings; ///< of the report, for values that are texts in it
     DataFiles &files;
     Progress &progress;
     /// Is asked now and then; its true ends the rows.

@@ -11,7 +11,8 @@ Expected<std::unique_ptr<RowList>> JobData::open(const QString &name, const Vari
     JsonPath path;
     path.emplace_back(QStringLiteral("data"));
     path.emplace_back(name);
-    return set.source->open({source_, path, variablesIn, set.units, firstOnly, files_, progress_, isStopped_});
+    return set.source->open(
+        {source_, path, variablesIn, set.units, firstOnly, job_.settings, files_, progress_, isStopped_});
 }
 
 InputError JobData::noRow(const QString &name, const JsonPath &step) const

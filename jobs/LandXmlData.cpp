@@ -28,8 +28,8 @@ private:
     {
         LandXmlQuery query = query_;
         query.unit = isInFileUnits_ ? std::nullopt : std::optional(request.units.factorOf(VARIABLE_LENGTH));
-        auto rows = std::make_unique<LandXmlList>(bytes, std::move(query),
-                                                  request.variablesIn(LandXmlList::units()).find, progress);
+        auto rows = std::make_unique<LandXmlList>(
+            bytes, std::move(query), request.variablesIn(LandXmlList::units()).find, progress, request.settings);
         if (auto error = rows->error()) {
             return *std::move(error);
         }

@@ -1282,6 +1282,16 @@
         <translation>kein Schlüssel der Objekte ist eine Variable des Wörterbuchs; die Schlüssel sind: %1</translation>
     </message>
     <message>
+        <location filename="../sources/landxml/ElementRows.cpp"/>
+        <source>the tangents of the element are parallel: it has no PI</source>
+        <translation>die Tangenten des Elements sind parallel: es hat keinen Tangentenschnittpunkt</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlArc.cpp"/>
+        <source>the element has no geometry: its radius does not reach from its start to its end</source>
+        <translation>das Element hat keine Geometrie: sein Halbmesser reicht nicht vom Anfang zum Ende</translation>
+    </message>
+    <message>
         <location filename="../sources/landxml/LandXmlComparison.cpp"/>
         <source>%1 is %2 in the file, but %3 by its geometry</source>
         <translation>%1 ist in der Datei %2, nach der Geometrie aber %3</translation>
@@ -1293,48 +1303,48 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlComparison.cpp"/>
+        <source>the element begins at an angle of %1 to the end of the element before: perhaps one of them bends to the other side</source>
+        <translation>das Element beginnt in einem Winkel von %1 zum Ende des Elements davor: vielleicht biegt eines der beiden zur anderen Seite</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlComparison.cpp"/>
         <source>%1 is %2 beside the tangents of the element: perhaps the element bends to the other side</source>
         <translation>%1 liegt %2 neben den Tangenten des Elements: vielleicht biegt das Element zur anderen Seite</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element has no geometry: a radius above zero was expected</source>
-        <translation>das Element hat keine Geometrie: ein Halbmesser über null wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element has no geometry: a length above zero was expected</source>
-        <translation>das Element hat keine Geometrie: eine Länge über null wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element turns too many times</source>
-        <translation>das Element dreht sich zu oft im Kreis</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element turns by more than 45 degrees from its tangent: its form allows less</source>
-        <translation>das Element dreht um mehr als 45 Grad von seiner Tangente ab: seine Form lässt weniger zu</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element is curved at both ends: its form needs a straight end</source>
-        <translation>das Element ist an beiden Enden gekrümmt: seine Form braucht ein gerades Ende</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element has no geometry: %1 was expected</source>
-        <translation>das Element hat keine Geometrie: %1 wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>
         <source>the point "%1" is not in the file</source>
         <translation>der Punkt „%1“ ist nicht in der Datei</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element has no geometry: its radius does not reach from its start to its end</source>
-        <translation>das Element hat keine Geometrie: sein Halbmesser reicht nicht vom Anfang zum Ende</translation>
+        <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>
+        <source>the element has no geometry: a radius above zero was expected</source>
+        <translation>das Element hat keine Geometrie: ein Halbmesser über null wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>
+        <source>the element has no geometry: a length above zero was expected</source>
+        <translation>das Element hat keine Geometrie: eine Länge über null wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>
+        <source>the element turns too many times</source>
+        <translation>das Element dreht sich zu oft im Kreis</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>
+        <source>the element turns by more than 45 degrees from its tangent: its form allows less</source>
+        <translation>das Element dreht um mehr als 45 Grad von seiner Tangente ab: seine Form lässt weniger zu</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>
+        <source>the element is curved at both ends: its form needs a straight end</source>
+        <translation>das Element ist an beiden Enden gekrümmt: seine Form braucht ein gerades Ende</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>
+        <source>the element has no geometry: %1 was expected</source>
+        <translation>das Element hat keine Geometrie: %1 wurde erwartet</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
@@ -1358,13 +1368,33 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlNames.cpp"/>
-        <source>"%1" is not in the file, which has no names for it</source>
-        <translation>„%1“ ist nicht in der Datei, die dafür keine Namen hat</translation>
+        <source>the file has no group of points "%1"</source>
+        <translation>die Datei hat keine Punktgruppe „%1“</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlNames.cpp"/>
-        <source>"%1" is not in the file: one of %2 was expected</source>
-        <translation>„%1“ ist nicht in der Datei: erwartet wurde eines von %2</translation>
+        <source>the file has no surface "%1" for this list</source>
+        <translation>die Datei hat für diese Liste keine Oberfläche „%1“</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlNames.cpp"/>
+        <source>the file has no parcel "%1"</source>
+        <translation>die Datei hat kein Flurstück „%1“</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlNames.cpp"/>
+        <source>the file has no alignment "%1"</source>
+        <translation>die Datei hat keine Achse „%1“</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlNames.cpp"/>
+        <source>the file has no grade line "%1" in the alignments that are listed</source>
+        <translation>die Datei hat in den Achsen der Liste keine Gradiente „%1“</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlNames.cpp"/>
+        <source>there are no names to choose from</source>
+        <translation>es gibt keine Namen zur Auswahl</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlNotes.cpp"/>
@@ -1427,12 +1457,12 @@
         <translation>das Attribut %1 wurde erwartet</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlReaderAttributes.cpp"/>
+        <location filename="../sources/landxml/LandXmlReaderNumbers.cpp"/>
         <source>the attribute %1="%2" does not fit: a number was expected</source>
         <translation>das Attribut %1="%2" passt nicht: eine Zahl wurde erwartet</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlReaderAttributes.cpp"/>
+        <location filename="../sources/landxml/LandXmlReaderNumbers.cpp"/>
         <source>the attribute %1="%2" does not fit: an angle in the file's unit was expected</source>
         <translation>das Attribut %1="%2" passt nicht: ein Winkel in der Einheit der Datei wurde erwartet</translation>
     </message>
@@ -1467,22 +1497,32 @@
         <translation>mehrere Punkte haben den Namen „%1“, auf den verwiesen wird: der erste wurde genommen</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlRoute.cpp"/>
+        <location filename="../sources/landxml/LandXmlRouteMaker.cpp"/>
+        <source>the alignment has no staStart: its stations count from 0</source>
+        <translation>die Achse hat kein staStart: ihre Stationen zählen ab 0</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRouteMaker.cpp"/>
         <source>the element has no length and was left out</source>
         <translation>das Element hat keine Länge und wurde weggelassen</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlRoute.cpp"/>
+        <location filename="../sources/landxml/LandXmlRouteMaker.cpp"/>
         <source>the elements turn too many times</source>
         <translation>die Elemente drehen sich zu oft im Kreis</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlRoute.cpp"/>
+        <location filename="../sources/landxml/LandXmlRouteMaker.cpp"/>
         <source>the station equation is before the start or not ahead of the equation before it, or has no numbers: staInternal or staBack, and staAhead were expected</source>
         <translation>die Stationsgleichung liegt vor dem Anfang oder nicht hinter der vorigen Gleichung, oder ihr fehlen Zahlen: staInternal oder staBack, und staAhead wurden erwartet</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlRoute.cpp"/>
+        <location filename="../sources/landxml/LandXmlRouteMaker.cpp"/>
+        <source>the station equation is after the end of the alignment, where no station counts by it</source>
+        <translation>die Stationsgleichung liegt hinter dem Ende der Achse, wo keine Station nach ihr zählt</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRouteMaker.cpp"/>
         <source>the stations of the surface "%1" do not ascend: no heights are taken from it</source>
         <translation>die Stationen der Oberfläche „%1“ steigen nicht an: ihr werden keine Höhen entnommen</translation>
     </message>
@@ -1512,6 +1552,16 @@
         <translation>die Einheit %1="%2" ist nicht bekannt</translation>
     </message>
     <message>
+        <location filename="../sources/landxml/LandXmlWidths.cpp"/>
+        <source>the widths belong to the alignment "%1", which is not in the file</source>
+        <translation>die Breiten gehören zur Achse „%1“, die nicht in der Datei ist</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlWidths.cpp"/>
+        <source>the alignment has too many zones: the widths of the last ones are not listed</source>
+        <translation>die Achse hat zu viele Zonen: die Breiten der letzten werden nicht aufgeführt</translation>
+    </message>
+    <message>
         <location filename="../sources/landxml/ParcelRows.cpp"/>
         <source>the border of the parcel does not close: there is a gap of %1 metres</source>
         <translation>die Grenze des Flurstücks schließt sich nicht: es bleibt eine Lücke von %1 Metern</translation>
@@ -1535,6 +1585,11 @@
         <location filename="../sources/landxml/ProjectedRows.cpp"/>
         <source>the file has several alignments: the name of one was expected</source>
         <translation>die Datei hat mehrere Achsen: der Name von einer wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/ProjectedRows.cpp"/>
+        <source>several alignments have the name "%1": the first one was taken</source>
+        <translation>mehrere Achsen haben den Namen „%1“: die erste wurde genommen</translation>
     </message>
     <message>
         <location filename="../sources/landxml/ProjectedRows.cpp"/>
@@ -1572,6 +1627,11 @@
         <translation>an einem Mittelpunkt</translation>
     </message>
     <message>
+        <location filename="../sources/landxml/SectionRows.cpp"/>
+        <source>the cross section is before the start or after the end of the alignment: its points have no coordinates</source>
+        <translation>das Querprofil liegt vor dem Anfang oder hinter dem Ende der Achse: seine Punkte haben keine Koordinaten</translation>
+    </message>
+    <message>
         <location filename="../sources/landxml/StationPlaces.cpp"/>
         <source>the alignment has no station %1</source>
         <translation>die Achse hat keine Station %1</translation>
@@ -1583,6 +1643,11 @@
     </message>
     <message>
         <location filename="../sources/landxml/StationRows.cpp"/>
+        <source>the alignment has no elements, and therefore no stations</source>
+        <translation>die Achse hat keine Elemente und deshalb keine Stationen</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/StationRows.cpp"/>
         <source>the interval gives more than %1 stations</source>
         <translation>der Abstand ergibt mehr als %1 Stationen</translation>
     </message>
@@ -1590,21 +1655,6 @@
         <location filename="../sources/landxml/StationRows.cpp"/>
         <source>the line at the offset %1 does not run forward here: the radius of the element is %2</source>
         <translation>die Linie im Abstand %1 läuft hier nicht vorwärts: der Halbmesser des Elements ist %2</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/XmlStream.cpp"/>
-        <source>the document type is in another file, "%1", which is not read: a file that needs no other was expected</source>
-        <translation>der Dokumenttyp steht in einer anderen Datei, „%1“, die nicht gelesen wird: erwartet wurde eine Datei, die keine andere braucht</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/XmlStream.cpp"/>
-        <source>the file declares the entity "%1": a file without entities was expected</source>
-        <translation>die Datei erklärt die Entität „%1“: eine Datei ohne Entitäten wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/XmlStream.cpp"/>
-        <source>the entity "%1" is not known</source>
-        <translation>die Entität „%1“ ist nicht bekannt</translation>
     </message>
     <message>
         <location filename="../sources/landxml/XmlStream.cpp"/>
@@ -1625,6 +1675,21 @@
         <location filename="../sources/landxml/XmlStream.cpp"/>
         <source>the elements are nested more than %1 deep</source>
         <translation>die Elemente sind tiefer als %1 ineinander geschachtelt</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/XmlStreamCallbacks.h"/>
+        <source>the document type is in another file, "%1", which is not read: a file that needs no other was expected</source>
+        <translation>der Dokumenttyp steht in einer anderen Datei, „%1“, die nicht gelesen wird: erwartet wurde eine Datei, die keine andere braucht</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/XmlStreamCallbacks.h"/>
+        <source>the file declares the entity "%1": a file without entities was expected</source>
+        <translation>die Datei erklärt die Entität „%1“: eine Datei ohne Entitäten wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/XmlStreamCallbacks.h"/>
+        <source>the entity "%1" is not known</source>
+        <translation>die Entität „%1“ ist nicht bekannt</translation>
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresColumns.cpp"/>

@@ -1282,6 +1282,16 @@
         <translation>辞書の変数であるキーがオブジェクトにありません。キーは次のとおりです: %1</translation>
     </message>
     <message>
+        <location filename="../sources/landxml/ElementRows.cpp"/>
+        <source>the tangents of the element are parallel: it has no PI</source>
+        <translation>要素の接線が平行です: PIはありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlArc.cpp"/>
+        <source>the element has no geometry: its radius does not reach from its start to its end</source>
+        <translation>要素の形状を求められません: 半径が始点から終点まで届きません</translation>
+    </message>
+    <message>
         <location filename="../sources/landxml/LandXmlComparison.cpp"/>
         <source>%1 is %2 in the file, but %3 by its geometry</source>
         <translation>%1 はファイルでは %2 ですが、形状からは %3 です</translation>
@@ -1293,48 +1303,48 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlComparison.cpp"/>
+        <source>the element begins at an angle of %1 to the end of the element before: perhaps one of them bends to the other side</source>
+        <translation>要素の始点の方向が、前の要素の終点の方向と%1だけ異なります: どちらかの要素が反対側に曲がっている可能性があります</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlComparison.cpp"/>
         <source>%1 is %2 beside the tangents of the element: perhaps the element bends to the other side</source>
         <translation>%1 は要素の接線から %2 離れています: 要素は反対側に曲がっている可能性があります</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element has no geometry: a radius above zero was expected</source>
-        <translation>要素の形状を求められません: 0 より大きい半径が必要です</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element has no geometry: a length above zero was expected</source>
-        <translation>要素の形状を求められません: 0 より大きい長さが必要です</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element turns too many times</source>
-        <translation>要素の周回数が多すぎます</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element turns by more than 45 degrees from its tangent: its form allows less</source>
-        <translation>要素が接線から 45 度を超えて離れており、この曲線形では表せません</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element is curved at both ends: its form needs a straight end</source>
-        <translation>要素の両端が曲がっており、この曲線形では表せません: 一方の端は直線である必要があります</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element has no geometry: %1 was expected</source>
-        <translation>要素の形状を求められません: %1 が必要です</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
+        <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>
         <source>the point "%1" is not in the file</source>
         <translation>点「%1」がファイルにありません</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
-        <source>the element has no geometry: its radius does not reach from its start to its end</source>
-        <translation>要素の形状を求められません: 半径が始点から終点まで届きません</translation>
+        <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>
+        <source>the element has no geometry: a radius above zero was expected</source>
+        <translation>要素の形状を求められません: 0 より大きい半径が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>
+        <source>the element has no geometry: a length above zero was expected</source>
+        <translation>要素の形状を求められません: 0 より大きい長さが必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>
+        <source>the element turns too many times</source>
+        <translation>要素の周回数が多すぎます</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>
+        <source>the element turns by more than 45 degrees from its tangent: its form allows less</source>
+        <translation>要素が接線から 45 度を超えて離れており、この曲線形では表せません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>
+        <source>the element is curved at both ends: its form needs a straight end</source>
+        <translation>要素の両端が曲がっており、この曲線形では表せません: 一方の端は直線である必要があります</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>
+        <source>the element has no geometry: %1 was expected</source>
+        <translation>要素の形状を求められません: %1 が必要です</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlGeometry.cpp"/>
@@ -1358,13 +1368,33 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlNames.cpp"/>
-        <source>"%1" is not in the file, which has no names for it</source>
-        <translation>「%1」はファイルにありません。ファイルにはこれに当たる名前がありません</translation>
+        <source>the file has no group of points "%1"</source>
+        <translation>ファイルに点のグループ「%1」がありません</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlNames.cpp"/>
-        <source>"%1" is not in the file: one of %2 was expected</source>
-        <translation>「%1」はファイルにありません：%2 のいずれかが必要です</translation>
+        <source>the file has no surface "%1" for this list</source>
+        <translation>このリストのためのサーフェス「%1」がファイルにありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlNames.cpp"/>
+        <source>the file has no parcel "%1"</source>
+        <translation>ファイルに区画「%1」がありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlNames.cpp"/>
+        <source>the file has no alignment "%1"</source>
+        <translation>ファイルに線形「%1」がありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlNames.cpp"/>
+        <source>the file has no grade line "%1" in the alignments that are listed</source>
+        <translation>リストの線形に計画縦断線「%1」がありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlNames.cpp"/>
+        <source>there are no names to choose from</source>
+        <translation>選べる名前はありません</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlNotes.cpp"/>
@@ -1427,12 +1457,12 @@
         <translation>属性 %1 が必要です</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlReaderAttributes.cpp"/>
+        <location filename="../sources/landxml/LandXmlReaderNumbers.cpp"/>
         <source>the attribute %1="%2" does not fit: a number was expected</source>
         <translation>属性 %1="%2" が合いません: 数値が必要です</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlReaderAttributes.cpp"/>
+        <location filename="../sources/landxml/LandXmlReaderNumbers.cpp"/>
         <source>the attribute %1="%2" does not fit: an angle in the file's unit was expected</source>
         <translation>属性 %1="%2" が合いません: ファイルの単位の角度が必要です</translation>
     </message>
@@ -1467,22 +1497,32 @@
         <translation>参照先の名前「%1」の点が複数あります: 最初の点を使いました</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlRoute.cpp"/>
+        <location filename="../sources/landxml/LandXmlRouteMaker.cpp"/>
+        <source>the alignment has no staStart: its stations count from 0</source>
+        <translation>線形にstaStartがありません: 測点は0から数えます</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRouteMaker.cpp"/>
         <source>the element has no length and was left out</source>
         <translation>要素に長さがないため除きました</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlRoute.cpp"/>
+        <location filename="../sources/landxml/LandXmlRouteMaker.cpp"/>
         <source>the elements turn too many times</source>
         <translation>要素の周回数の合計が多すぎます</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlRoute.cpp"/>
+        <location filename="../sources/landxml/LandXmlRouteMaker.cpp"/>
         <source>the station equation is before the start or not ahead of the equation before it, or has no numbers: staInternal or staBack, and staAhead were expected</source>
         <translation>測点のブレーキが始点より手前か、前のブレーキより先にないか、数値がありません: staInternal または staBack と、staAhead が必要です</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlRoute.cpp"/>
+        <location filename="../sources/landxml/LandXmlRouteMaker.cpp"/>
+        <source>the station equation is after the end of the alignment, where no station counts by it</source>
+        <translation>測点のブレーキが線形の終点より後にあり、どの測点にも使われません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRouteMaker.cpp"/>
         <source>the stations of the surface "%1" do not ascend: no heights are taken from it</source>
         <translation>サーフェス「%1」の測点が昇順ではありません: この高さは使いません</translation>
     </message>
@@ -1512,6 +1552,16 @@
         <translation>単位 %1="%2" は不明です</translation>
     </message>
     <message>
+        <location filename="../sources/landxml/LandXmlWidths.cpp"/>
+        <source>the widths belong to the alignment "%1", which is not in the file</source>
+        <translation>幅員は線形「%1」のものですが、その線形はファイルにありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlWidths.cpp"/>
+        <source>the alignment has too many zones: the widths of the last ones are not listed</source>
+        <translation>線形のゾーンが多すぎます: 最後のゾーンの幅員は表示されません</translation>
+    </message>
+    <message>
         <location filename="../sources/landxml/ParcelRows.cpp"/>
         <source>the border of the parcel does not close: there is a gap of %1 metres</source>
         <translation>区画の境界が閉じていません: %1 メートルの隙間があります</translation>
@@ -1535,6 +1585,11 @@
         <location filename="../sources/landxml/ProjectedRows.cpp"/>
         <source>the file has several alignments: the name of one was expected</source>
         <translation>ファイルに線形が複数あります: いずれかの名前が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/ProjectedRows.cpp"/>
+        <source>several alignments have the name "%1": the first one was taken</source>
+        <translation>複数の線形に名前「%1」があります: 最初のものを使いました</translation>
     </message>
     <message>
         <location filename="../sources/landxml/ProjectedRows.cpp"/>
@@ -1572,6 +1627,11 @@
         <translation>中心点</translation>
     </message>
     <message>
+        <location filename="../sources/landxml/SectionRows.cpp"/>
+        <source>the cross section is before the start or after the end of the alignment: its points have no coordinates</source>
+        <translation>横断面が線形の始点より前か終点より後にあります: 点の座標はありません</translation>
+    </message>
+    <message>
         <location filename="../sources/landxml/StationPlaces.cpp"/>
         <source>the alignment has no station %1</source>
         <translation>線形に測点 %1 がありません</translation>
@@ -1583,6 +1643,11 @@
     </message>
     <message>
         <location filename="../sources/landxml/StationRows.cpp"/>
+        <source>the alignment has no elements, and therefore no stations</source>
+        <translation>線形に要素がないため、測点がありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/StationRows.cpp"/>
         <source>the interval gives more than %1 stations</source>
         <translation>この間隔では測点が %1 を超えます</translation>
     </message>
@@ -1590,21 +1655,6 @@
         <location filename="../sources/landxml/StationRows.cpp"/>
         <source>the line at the offset %1 does not run forward here: the radius of the element is %2</source>
         <translation>オフセット %1 の線はここで前方に進みません: 要素の半径は %2 です</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/XmlStream.cpp"/>
-        <source>the document type is in another file, "%1", which is not read: a file that needs no other was expected</source>
-        <translation>文書型が別のファイル「%1」にあり、これは読み込みません: 他のファイルを必要としないファイルが必要です</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/XmlStream.cpp"/>
-        <source>the file declares the entity "%1": a file without entities was expected</source>
-        <translation>ファイルが実体「%1」を宣言しています: 実体のないファイルが必要です</translation>
-    </message>
-    <message>
-        <location filename="../sources/landxml/XmlStream.cpp"/>
-        <source>the entity "%1" is not known</source>
-        <translation>実体「%1」は不明です</translation>
     </message>
     <message>
         <location filename="../sources/landxml/XmlStream.cpp"/>
@@ -1625,6 +1675,21 @@
         <location filename="../sources/landxml/XmlStream.cpp"/>
         <source>the elements are nested more than %1 deep</source>
         <translation>要素の入れ子が %1 段を超えています</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/XmlStreamCallbacks.h"/>
+        <source>the document type is in another file, "%1", which is not read: a file that needs no other was expected</source>
+        <translation>文書型が別のファイル「%1」にあり、これは読み込みません: 他のファイルを必要としないファイルが必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/XmlStreamCallbacks.h"/>
+        <source>the file declares the entity "%1": a file without entities was expected</source>
+        <translation>ファイルが実体「%1」を宣言しています: 実体のないファイルが必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/XmlStreamCallbacks.h"/>
+        <source>the entity "%1" is not known</source>
+        <translation>実体「%1」は不明です</translation>
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresColumns.cpp"/>

@@ -38,10 +38,29 @@ bool isAny(const std::vector<LandXmlNamed> &names)
     return std::any_of(names.begin(), names.end(), [](const LandXmlNamed &named) { return named.count > 0; });
 }
 
+/// Whether an alignment has something for a list.
+bool hasRowsOf(LandXmlListKind kind, const LandXmlContents::Alignment &alignment)
+{
+    switch (kind) {
+    case LandXmlListKind::Elements:
+    case LandXmlListKind::Stations:
+    case LandXmlListKind::OffsetsOf: return alignment.elements > 0;
+    case LandXmlListKind::Profile: return isAny(alignment.gradeLines);
+    case LandXmlListKind::CrossSections: return alignment.sections > 0;
+    default: return true;
+    }
+}
+
+bool anyHasRowsOf(LandXmlListKind kind, const LandXmlContents &contents)
+{
+    return std::any_of(contents.alignments.begin(), contents.alignments.end(),
+                       [kind](const LandXmlContents::Alignment &alignment) { return hasRowsOf(kind, alignment); });
+}
+
 std::vector<OfferedList> listsOf(const LandXmlContents &contents)
 {
     using Kind = LandXmlListKind;
-    const bool hasElements = isAny(contents.alignments);
+    const bool hasElements = anyHasRowsOf(Kind::Elements, contents);
     return {
         {Kind::Points, Xlate("Points"), isAny(contents.groups)},
         {Kind::SurfacePoints, Xlate("Points of surfaces"), isAny(contents.surfaces)},
@@ -50,8 +69,8 @@ std::vector<OfferedList> listsOf(const LandXmlContents &contents)
         {Kind::Alignments, Xlate("Alignments"), !contents.alignments.empty()},
         {Kind::Elements, Xlate("Elements of alignments"), hasElements},
         {Kind::Stations, Xlate("Stations"), hasElements},
-        {Kind::Profile, Xlate("Profile"), isAny(contents.gradeLines)},
-        {Kind::CrossSections, Xlate("Cross sections"), contents.sections > 0},
+        {Kind::Profile, Xlate("Profile"), anyHasRowsOf(Kind::Profile, contents)},
+        {Kind::CrossSections, Xlate("Cross sections"), anyHasRowsOf(Kind::CrossSections, contents)},
         {Kind::OffsetsOf, Xlate("Points beside an alignment"), hasElements && isAny(contents.groups)},
     };
 }
@@ -91,6 +110,8 @@ LandXmlChoice::LandXmlChoice(QFormLayout &form) : form_(form), list_(new QComboB
     interval_->setSpecialValueText(Xlate("none"));
     interval_->setToolTip(plainToolTip(Xlate("The distance of regular stations, in the unit of the file")));
     QObject::connect(list_, &QComboBox::currentIndexChanged, list_, [this] { showRows(); });
+    QComboBox *alignment = boxOf(alignmentEntry); // the grade lines and the surfaces that are offered are its own
+    QObject::connect(alignment, &QComboBox::currentIndexChanged, alignment, [this] { showRows(); });
     showRows();
 }
 
@@ -128,15 +149,43 @@ QString LandXmlChoice::listKey() const
 }
 
 /// The names that a key of the list that is chosen may have.
-std::vector<LandXmlNamed> LandXmlChoice::namesOf(const QString &key) const
+QComboBox *LandXmlChoice::boxOf(const QString &key) const
 {
-    if (key == surfaceEntry) {
-        return listKey() == keyOf(LandXmlListKind::SurfacePoints) ? contents_.surfaces : contents_.surfaceLines;
+    const auto row = std::find_if(names_.begin(), names_.end(), [&](const Names &names) { return names.key == key; });
+    return row->box;
+}
+
+/// The names that the chosen list can be asked for. Grade lines and surfaces are those of the chosen alignment.
+QStringList LandXmlChoice::namesOf(const QString &key) const
+{
+    const auto kind = landXmlListFromKey(listKey());
+    QStringList names;
+    const auto add = [&names](const std::vector<LandXmlNamed> &found) {
+        for (const LandXmlNamed &named : found) {
+            names.append(named.name);
+        }
+    };
+    if (key == QStringLiteral("group")) {
+        add(contents_.groups);
+    } else if (key == QStringLiteral("parcel")) {
+        add(contents_.parcels);
+    } else if (kind == LandXmlListKind::SurfacePoints) {
+        add(contents_.surfaces);
     }
-    return key == alignmentEntry             ? contents_.alignments
-           : key == QStringLiteral("group")  ? contents_.groups
-           : key == QStringLiteral("parcel") ? contents_.parcels
-                                             : contents_.gradeLines;
+    const QString chosen = boxOf(alignmentEntry)->currentData().toString();
+    const bool isAlong = kind && landXmlKeysOf(*kind).contains(alignmentEntry);
+    for (const LandXmlContents::Alignment &alignment : contents_.alignments) {
+        const bool isOffered = isAlong && hasRowsOf(*kind, alignment);
+        if (isOffered && key == alignmentEntry) {
+            names.append(alignment.name);
+        } else if (isOffered && (chosen.isEmpty() || chosen == alignment.name)) {
+            add(key == gradeLineEntry                    ? alignment.gradeLines
+                : key != surfaceEntry                    ? std::vector<LandXmlNamed>()
+                : kind == LandXmlListKind::CrossSections ? alignment.surfacesAcross
+                                                         : alignment.surfacesAlong);
+        }
+    }
+    return names;
 }
 
 /// Shows the rows that the list has a use for, with the names for it.
@@ -148,15 +197,17 @@ void LandXmlChoice::showRows()
     form_.setRowVisible(interval_, used.contains(intervalEntry));
     for (const Names &row : names_) {
         const QString chosen = row.box->currentData().toString();
+        const QSignalBlocker blocker(row.box);
         row.box->clear();
-        const std::vector<LandXmlNamed> names = namesOf(row.key);
-        const bool isNeeded = kind == LandXmlListKind::OffsetsOf && row.key == alignmentEntry && names.size() > 1;
+        const QStringList names = namesOf(row.key);
+        const bool isNeeded =
+            kind == LandXmlListKind::OffsetsOf && row.key == alignmentEntry && contents_.alignments.size() > 1;
         if (!isNeeded) {
             row.box->addItem(isOne(row.key, kind) ? Xlate("(the first)") : Xlate("(all)"), QString());
         }
-        for (const LandXmlNamed &named : names) {
-            if (!named.name.isEmpty() && row.box->findData(named.name) < 0) {
-                row.box->addItem(named.name, named.name);
+        for (const QString &name : names) {
+            if (!name.isEmpty() && row.box->findData(name) < 0) {
+                row.box->addItem(name, name);
             }
         }
         row.box->setCurrentIndex(std::max(0, row.box->findData(chosen)));

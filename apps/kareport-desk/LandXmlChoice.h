@@ -4,6 +4,7 @@
 
 #include <QJsonObject>
 #include <QString>
+#include <QStringList>
 
 #include <vector>
 
@@ -45,7 +46,8 @@ private:
         QComboBox *box;
     };
 
-    std::vector<LandXmlNamed> namesOf(const QString &key) const;
+    QComboBox *boxOf(const QString &key) const;
+    QStringList namesOf(const QString &key) const;
     QString listKey() const;
     void showRows();
 

@@ -2,6 +2,10 @@
 
 #include "CurveFit.h"
 #include "VariableType.h"
+#include "Xlate.h"
+
+#include <cmath>
+#include <numbers>
 
 namespace kareport
 {
@@ -121,10 +125,32 @@ bool ElementRows::load()
     for (const LandXmlRoute &route : model_.routes) {
         for (std::size_t i = 0; i < route.pieces.size(); ++i) {
             rows_.emplace_back(&route, i);
+            noteIntersection(route, route.pieces[i]);
         }
     }
     count_ = rows_.size();
     return expectNames();
+}
+
+/// Where the tangents of an element meet; nothing of one that turns by half a circle, but for what its ends are rounded to.
+std::optional<PlanePoint> ElementRows::intersectionOf(const LandXmlRoute::Piece &piece) const
+{
+    if (piece.curves.size() != 1) {
+        return std::nullopt;
+    }
+    const PlaneCurve &curve = piece.curves.front();
+    const double turn = std::fabs(curve.turnTo(curve.length()));
+    const double beyondHalf = std::fabs(std::remainder(turn - std::numbers::pi, 2 * std::numbers::pi));
+    return beyondHalf * curve.length() > source_.query.tolerance.length ? tangentIntersection(curve) : std::nullopt;
+}
+
+void ElementRows::noteIntersection(const LandXmlRoute &route, const LandXmlRoute::Piece &piece)
+{
+    const bool isCurved = piece.curves.size() == 1 && !piece.curves.front().isLine();
+    if (isCurved && !intersectionOf(piece)) {
+        modelNotes_.add(route.stored->elements[piece.element].byte,
+                        Xlate("the tangents of the element are parallel: it has no PI"));
+    }
 }
 
 void ElementRows::take(std::size_t index)
@@ -146,8 +172,7 @@ void ElementRows::take(std::size_t index)
     startPoint_ = start_->point;
     endPoint_ = end_->point;
     centre_ = centreOf(piece_->curves.front());
-    intersection_ =
-        piece_->curves.size() == 1 ? tangentIntersection(piece_->curves.front()) : std::optional<PlanePoint>();
+    intersection_ = intersectionOf(*piece_);
 }
 
 } // namespace kareport

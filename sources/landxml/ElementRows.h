@@ -22,6 +22,9 @@ protected:
 private:
     struct Variables;
 
+    std::optional<PlanePoint> intersectionOf(const LandXmlRoute::Piece &piece) const;
+    void noteIntersection(const LandXmlRoute &route, const LandXmlRoute::Piece &piece);
+
     AlignmentModel model_;
     std::vector<std::pair<const LandXmlRoute *, std::size_t>> rows_; ///< and the piece
     const LandXmlRoute *route_ = nullptr;

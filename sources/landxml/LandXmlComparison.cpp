@@ -48,17 +48,23 @@ void LandXmlComparison::area(std::size_t byte, const char *what, double stated, 
     }
 }
 
-void LandXmlComparison::direction(std::size_t byte, const char *what, double stated, double bearing)
+/// How far the direction of an element of a length may be off, when its ends are by the tolerance of lengths.
+double LandXmlComparison::allowedTurn(double length) const
+{
+    return std::max(tolerance_.angle, tolerance_.length / length);
+}
+
+void LandXmlComparison::direction(std::size_t byte, const char *what, double stated, double bearing, double length)
 {
     if (!std::isnan(stated)) {
-        directions_.push_back({byte, what, stated, bearing});
+        directions_.push_back({byte, what, stated, bearing, allowedTurn(length)});
     }
 }
 
 void LandXmlComparison::noteDirections()
 {
-    const auto fits = [this](const Direction &direction, double (*reading)(double)) {
-        return std::fabs(turnBetween(reading(direction.stated), direction.bearing)) <= tolerance_.angle;
+    const auto fits = [](const Direction &direction, double (*reading)(double)) {
+        return std::fabs(turnBetween(reading(direction.stated), direction.bearing)) <= direction.allowed;
     };
     std::ptrdiff_t most = -1;
     double (*best)(double) = nullptr;
@@ -94,6 +100,20 @@ void LandXmlComparison::gap(std::size_t byte, double width)
 {
     if (!(width <= tolerance_.length)) {
         notes_.add(byte, Xlate("the element begins %1 from the end of the element before").arg(lengthText(width)));
+    }
+}
+
+void LandXmlComparison::corner(std::size_t byte, const PlaneCurve &before, const PlaneCurve &curve)
+{
+    if (before.isLine() && curve.isLine()) {
+        return; // lines may meet at any angle
+    }
+    const double turn = turnBetween(before.end().bearing, curve.start().bearing);
+    if (!(std::fabs(turn) <= allowedTurn(before.length()) + allowedTurn(curve.length()))) {
+        notes_.add(byte,
+                   Xlate("the element begins at an angle of %1 to the end of the element before: perhaps one of them "
+                         "bends to the other side")
+                       .arg(landXmlAngleText(turn, units_.angle)));
     }
 }
 

@@ -35,12 +35,16 @@ public:
     /// Areas are stated with few digits: they may differ by one part in a thousand, or a tenth of a square metre; by more or
     /// less in proportion to another tolerance of lengths than the default one.
     void area(std::size_t byte, const char *what, double stated, double computed);
-    /// Keeps a direction for `noteDirections`.
-    void direction(std::size_t byte, const char *what, double stated, double bearing);
+    /// Keeps a direction for `noteDirections`. The shorter an element is, the more its direction depends on the digits of
+    /// its ends. @param length  of the element
+    void direction(std::size_t byte, const char *what, double stated, double bearing, double length);
     /// Compares the end of an element.
     void end(std::size_t byte, PlanePoint stated, PlanePoint computed);
     /// Notes an element that does not begin where the one before ends. @param width  how far it is
     void gap(std::size_t byte, double width);
+    /// Notes an element that does not continue in the direction of the one before: mostly because one of both bends to the
+    /// wrong side.
+    void corner(std::size_t byte, const PlaneCurve &before, const PlaneCurve &curve);
     /// The point where the tangents meet has to lie on both.
     void intersection(std::size_t byte, PlanePoint stated, const PlaneCurve &curve);
 
@@ -56,10 +60,12 @@ private:
         const char *what;
         double stated;
         double bearing;
+        double allowed; ///< how far they may differ
     };
 
     void note(std::size_t byte, const char *what, const QString &stated, const QString &computed);
     QString lengthText(double metres) const;
+    double allowedTurn(double length) const;
 
     LandXmlUnits units_;
     LandXmlTolerance tolerance_;

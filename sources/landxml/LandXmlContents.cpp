@@ -50,6 +50,7 @@ public:
     void endElement() override {}
     void text(std::string_view) override {}
     void foreignElement(std::string_view) override {}
+    void leftOutElements(std::string_view, std::size_t) override {}
 
 private:
     XmlStream stream_;
@@ -58,19 +59,23 @@ private:
 
 void addAlignments(LandXmlContents &contents, const std::vector<LandXmlAlignment> &alignments)
 {
-    NamesOnce surfaceLines(contents.surfaceLines);
     for (const LandXmlAlignment &alignment : alignments) {
-        contents.alignments.push_back({QString::fromStdString(alignment.name), alignment.elements.size()});
+        LandXmlContents::Alignment &found = contents.alignments.emplace_back();
+        found.name = QString::fromStdString(alignment.name);
+        found.elements = alignment.elements.size();
+        found.sections = alignment.sections.size();
+        NamesOnce gradeLines(found.gradeLines);
         for (const LandXmlGradeLine &line : alignment.gradeLines) {
-            contents.gradeLines.push_back({QString::fromStdString(line.name), line.points.size()});
+            gradeLines.add(line.name, line.points.size());
         }
+        NamesOnce along(found.surfacesAlong);
         for (const LandXmlHeightLine &line : alignment.surfaceLines) {
-            surfaceLines.add(line.name, line.points.size());
+            along.add(line.name, line.points.size());
         }
-        contents.sections += alignment.sections.size();
+        NamesOnce across(found.surfacesAcross);
         for (const LandXmlSection &section : alignment.sections) {
             for (const LandXmlSectionSurface &surface : section.surfaces) {
-                surfaceLines.add(surface.name, surface.points.size());
+                across.add(surface.name, surface.points.size());
             }
         }
     }
@@ -94,6 +99,7 @@ Expected<LandXmlContents> readLandXmlContents(const std::shared_ptr<const FileBy
     contents.version = std::get<LandXmlHeader>(header).version;
     LandXmlWants wants;
     wants.points = wants.surfacePoints = wants.alignments = wants.surfaceLines = wants.sections = wants.parcels = true;
+    wants.isTolerant = true; // what is sound in the file can be listed
     LandXmlNotes notes(file);
     LandXmlReader reader(file, std::get<LandXmlHeader>(header).units, wants, notes);
     std::vector<std::size_t> points;

@@ -21,14 +21,22 @@ struct LandXmlNamed
 /// The names in a file, for a user who chooses among them.
 struct LandXmlContents
 {
+    /// An alignment, with the names that lists of it can be asked for, each once.
+    struct Alignment
+    {
+        QString name;
+        std::size_t elements = 0;
+        std::size_t sections = 0;
+        std::vector<LandXmlNamed> gradeLines;
+        std::vector<LandXmlNamed> surfacesAlong;
+        std::vector<LandXmlNamed> surfacesAcross; ///< of the cross sections
+    };
+
     QString version;
     std::vector<LandXmlNamed> groups;
     std::vector<LandXmlNamed> surfaces;
-    std::vector<LandXmlNamed> alignments;
-    std::vector<LandXmlNamed> gradeLines;
-    std::vector<LandXmlNamed> surfaceLines; ///< surfaces along and across alignments, each name once
+    std::vector<Alignment> alignments;
     std::vector<LandXmlNamed> parcels;
-    std::size_t sections = 0; ///< cross sections of all alignments
 };
 
 /// Whether a file is a LandXML file by its outermost element.

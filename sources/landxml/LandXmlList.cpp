@@ -1,6 +1,7 @@
 #include "LandXmlList.h"
 
 #include "EntryOrder.h"
+#include "LandXmlTexts.h"
 #include "TextFolding.h"
 #include "Xlate.h"
 
@@ -29,8 +30,8 @@ void scale(LandXmlQuery &query, double unit)
 } // namespace
 
 LandXmlList::LandXmlList(std::shared_ptr<const FileBytes> file, LandXmlQuery query, const FindVariable &findVariable,
-                         ReadProgress progress)
-    : file_(std::move(file)), progress_(std::move(progress))
+                         ReadProgress progress, const UJobSettings &settings)
+    : file_(std::move(file)), progress_(std::move(progress)), settings_(settings)
 {
     auto header = readLandXmlHeader(file_);
     if (const InputError *error = errorOf(header)) {
@@ -66,7 +67,7 @@ void LandXmlList::bind(const FindVariable &findVariable)
         if (const auto parser = findVariable(variable.name)) {
             const bool isFirst = std::none_of(columns_.begin(), columns_.end(),
                                               [&](const Column &column) { return column.parser.id() == parser->id(); });
-            columns_.push_back({*parser, names_.size(), isFirst});
+            columns_.push_back({*parser, names_.size(), variable.type, isFirst});
         }
         names_.push_back(variable.name);
         known.append(variable.name);
@@ -155,6 +156,12 @@ bool LandXmlList::readRow(RowBatch &batch)
     return !batch.error;
 }
 
+bool LandXmlList::storeNumber(const Column &column, double number, UDataObject &object) const
+{
+    const auto text = column.parser.takesAnyText() ? landXmlText(number, column.type, settings_) : std::nullopt;
+    return text ? column.parser.store(text->toStdString(), object) : column.parser.storeNumber(number, object);
+}
+
 /// Stores the values of the row at hand. @return what is wrong with one
 std::optional<InputError> LandXmlList::storeValues(UDataObject &object, const std::vector<unsigned> *onlyIds) const
 {
@@ -169,7 +176,7 @@ std::optional<InputError> LandXmlList::storeValues(UDataObject &object, const st
         }
         bool fits = true;
         if (const auto *number = std::get_if<double>(&value)) {
-            fits = parser.storeNumber(*number, object);
+            fits = storeNumber(column, *number, object);
         } else if (const auto *text = std::get_if<std::string_view>(&value)) {
             fits = parser.store(*text, object);
         }

@@ -5,6 +5,7 @@
 #include "LandXmlRows.h"
 #include "RowBatches.h"
 #include "RowList.h"
+#include "UJobSettings.h"
 #include "ValueParser.h"
 
 #include <memory>
@@ -21,8 +22,9 @@ class LandXmlList : public RowList
 public:
     /// Reads the file up to its units. Variables that the dictionary does not know are left out.
     /// @param findVariable  gives parsers for the units of `units()`
+    /// @param settings      of the report, for lengths and stations that the dictionary has as texts
     LandXmlList(std::shared_ptr<const FileBytes> file, LandXmlQuery query, const FindVariable &findVariable,
-                ReadProgress progress);
+                ReadProgress progress, const UJobSettings &settings = {});
     ~LandXmlList() override;
 
     /// What the values are in, whatever the file's units are: metre, square metre, radian.
@@ -47,6 +49,7 @@ private:
     {
         ValueParser parser;
         std::size_t variable;
+        int type;     ///< that suits the variable
         bool isFirst; ///< of those with its identifier
     };
 
@@ -55,11 +58,13 @@ private:
     bool takeBatch();
     void fill(RowBatch &batch);
     bool readRow(RowBatch &batch);
+    bool storeNumber(const Column &column, double number, UDataObject &object) const;
     std::optional<InputError> storeValues(UDataObject &object, const std::vector<unsigned> *onlyIds) const;
     std::optional<InputError> endOfRows(const std::optional<InputError> &error) const;
 
     std::shared_ptr<const FileBytes> file_;
     ReadProgress progress_;
+    UJobSettings settings_;
     std::unique_ptr<LandXmlRows> rows_; ///< null when the file could not be begun
     std::vector<QString> names_;        ///< of the variables
     std::vector<Column> columns_;

@@ -152,12 +152,38 @@ struct LandXmlAlignment
     std::string name;
     std::string description;
     double staStart = 0;
+    bool isStartStated = false; ///< `staStart` is in the file
     double length = notGiven;
     std::vector<LandXmlEquation> equations;
     std::vector<LandXmlElement> elements;
     std::vector<LandXmlGradeLine> gradeLines;
     std::vector<LandXmlHeightLine> surfaceLines;
     std::vector<LandXmlSection> sections;
+    std::size_t byte = 0;
+};
+
+/// A width along an alignment that changes evenly between two stations, counted without equations.
+struct LandXmlWidth
+{
+    double staStart = notGiven;
+    double staEnd = notGiven;
+    double atStart = notGiven;
+    double atEnd = notGiven;
+};
+
+/// A stretch beside an alignment, such as a lane.
+struct LandXmlZone
+{
+    bool isRight = false;
+    LandXmlWidth whole;               ///< of the zone as a whole; it counts where there are no others
+    std::vector<LandXmlWidth> widths; ///< its pieces
+};
+
+/// Zones beside an alignment, from the middle outwards.
+struct LandXmlGradeSurface
+{
+    std::string alignment; ///< its name
+    std::vector<LandXmlZone> zones;
     std::size_t byte = 0;
 };
 

@@ -1,6 +1,9 @@
 #include "LandXmlNames.h"
 
+#include "NearestName.h"
 #include "Xlate.h"
+
+#include <algorithm>
 
 namespace kareport
 {
@@ -15,10 +18,23 @@ bool LandXmlNames::matches(const std::string &name)
         isFound_ = true;
         return true;
     }
-    if (others_.size() <= most && !text.isEmpty() && !others_.contains(text)) {
+    if (others_.size() < mostCompared && !text.isEmpty() && !known_.contains(text)) {
+        known_.insert(text);
         others_.append(text);
     }
     return false;
+}
+
+QString LandXmlNames::missing() const
+{
+    switch (of_) {
+    case Of::Group: return Xlate("the file has no group of points \"%1\"").arg(wanted_);
+    case Of::Surface: return Xlate("the file has no surface \"%1\" for this list").arg(wanted_);
+    case Of::Parcel: return Xlate("the file has no parcel \"%1\"").arg(wanted_);
+    case Of::Alignment: return Xlate("the file has no alignment \"%1\"").arg(wanted_);
+    case Of::GradeLine: break;
+    }
+    return Xlate("the file has no grade line \"%1\" in the alignments that are listed").arg(wanted_);
 }
 
 std::optional<InputError> LandXmlNames::error(const QString &path) const
@@ -28,14 +44,17 @@ std::optional<InputError> LandXmlNames::error(const QString &path) const
     }
     if (others_.isEmpty()) {
         return InputError{path, std::nullopt,
-                          Xlate("\"%1\" is not in the file, which has no names for it").arg(wanted_)};
+                          missing() + QStringLiteral("; ") + Xlate("there are no names to choose from")};
     }
-    QString names = others_.first(std::min(most, others_.size())).join(QStringLiteral(", "));
-    if (others_.size() > most) {
+    QString names = others_.first(std::min(mostShown, others_.size())).join(QStringLiteral(", "));
+    if (others_.size() > mostShown) {
         names += QStringLiteral(", …");
     }
-    return InputError{path, std::nullopt,
-                      Xlate("\"%1\" is not in the file: one of %2 was expected").arg(wanted_, names)};
+    QString text = missing() + QStringLiteral(": ") + Xlate("one of %1 was expected").arg(names);
+    if (const QString question = didYouMean(wanted_, others_); !question.isEmpty()) {
+        text += QStringLiteral("; ") + question;
+    }
+    return InputError{path, std::nullopt, text};
 }
 
 } // namespace kareport

@@ -2,6 +2,7 @@
 
 #include "InputError.h"
 
+#include <QSet>
 #include <QString>
 #include <QStringList>
 
@@ -16,8 +17,18 @@ namespace kareport
 class LandXmlNames
 {
 public:
+    /// What has the name.
+    enum class Of
+    {
+        Group,
+        Surface,
+        Parcel,
+        Alignment,
+        GradeLine
+    };
+
     /// @param wanted  empty where all names are
-    explicit LandXmlNames(QString wanted) : wanted_(std::move(wanted)) {}
+    LandXmlNames(Of of, QString wanted) : of_(of), wanted_(std::move(wanted)) {}
 
     /// Whether a name of the file is wanted.
     bool matches(const std::string &name);
@@ -26,11 +37,16 @@ public:
     std::optional<InputError> error(const QString &path) const;
 
 private:
-    static constexpr qsizetype most = 10; ///< names in a message
+    static constexpr qsizetype mostShown = 10;      ///< names in a message
+    static constexpr qsizetype mostCompared = 1000; ///< names among which the nearest is sought
 
+    QString missing() const;
+
+    Of of_;
     QString wanted_;
     bool isFound_ = false;
-    QStringList others_; ///< one more than are told, where there are more
+    QStringList others_;
+    QSet<QString> known_; ///< the others
 };
 
 } // namespace kareport

@@ -17,15 +17,16 @@ void LandXmlNotes::add(std::size_t byte, const QString &text)
     placed_.push_back({byte, text});
 }
 
-void LandXmlNotes::leaveOut(std::string_view element)
+void LandXmlNotes::leaveOut(std::string_view element, std::size_t count)
 {
+    element = element.substr(0, longestName);
     const auto known = passedOver_.find(element);
     if (known != passedOver_.end()) {
-        ++known->second;
+        known->second += count;
     } else if (passedOver_.size() < most) {
-        passedOver_.emplace(element.substr(0, 100), 1);
+        passedOver_.emplace(element, count);
     } else {
-        ++otherKinds_;
+        otherKinds_ += count;
     }
 }
 

@@ -22,8 +22,8 @@ public:
     explicit LandXmlNotes(std::shared_ptr<const FileBytes> file) : file_(std::move(file)) {}
 
     void add(std::size_t byte, const QString &text);
-    /// Counts an element that no list reads.
-    void leaveOut(std::string_view element);
+    /// Counts elements that no list reads, or that are in one.
+    void leaveOut(std::string_view element, std::size_t count = 1);
     void clear();
 
     /// All notes: first those with a place, in the order of the file, then the elements that were skipped, by their
@@ -31,6 +31,8 @@ public:
     std::vector<InputError> all() const;
 
 private:
+    static constexpr std::size_t longestName = 100;
+
     struct Note
     {
         std::size_t byte;

@@ -10,28 +10,57 @@ void LandXmlPointTable::add(const LandXmlPoint &point)
     if (isAlias || (point.name.empty() && point.id.empty())) {
         return;
     }
-    const Entry &entry = points_.emplace_back(
+    Entry &entry = points_.emplace_back(
         Entry{point.at.position, point.at.height, reference, point.name, point.id, point.code, point.description});
-    addTo(byName_, entry.name, entry);
-    addTo(byId_, entry.id, entry);
+    addTo(byName_, entry.name, entry, &Entry::nextOfName);
+    addTo(byId_, entry.id, entry, &Entry::nextOfId);
 }
 
-void LandXmlPointTable::addTo(Entries &entries, std::string_view key, const Entry &entry)
+void LandXmlPointTable::addTo(Entries &entries, std::string_view key, Entry &entry, Next next)
 {
     if (key.empty()) {
         return;
     }
-    const auto [known, isNew] = entries.try_emplace(key, Known{&entry, false});
-    known->second.isAmbiguous = !isNew;
+    const auto [place, isNew] = entries.try_emplace(key, Known{&entry, &entry, {}});
+    if (!isNew) {
+        place->second.last->*next = &entry;
+        place->second.last = &entry;
+    }
 }
 
-const LandXmlPointTable::Known *LandXmlPointTable::known(std::string_view name) const
+/// The points of a name, and how they are linked; null where there are none.
+std::pair<const LandXmlPointTable::Known *, LandXmlPointTable::Next>
+LandXmlPointTable::known(std::string_view name) const
 {
     if (const auto point = byName_.find(name); point != byName_.end()) {
-        return &point->second;
+        return {&point->second, &Entry::nextOfName};
     }
     const auto point = byId_.find(name);
-    return point != byId_.end() ? &point->second : nullptr;
+    return {point != byId_.end() ? &point->second : nullptr, &Entry::nextOfId};
+}
+
+/// The point with the position that a point has or refers to; null where there is none.
+const LandXmlPointTable::Entry *LandXmlPointTable::resolved(const Entry *entry) const
+{
+    for (int step = 0; step <= longestChain && entry != nullptr && !entry->position; ++step) {
+        const Known *next = known(entry->reference).first;
+        entry = next != nullptr ? next->entry : nullptr;
+    }
+    return entry != nullptr && entry->position ? entry : nullptr;
+}
+
+/// Whether points of one name are not one point.
+bool LandXmlPointTable::isAmbiguous(const Known &known, Next next) const
+{
+    if (!known.isAmbiguous) {
+        const Entry *const first = resolved(known.entry);
+        const Entry *other = known.entry->*next;
+        while (other != nullptr && resolved(other) == first) {
+            other = other->*next;
+        }
+        known.isAmbiguous = other != nullptr;
+    }
+    return *known.isAmbiguous;
 }
 
 std::optional<LandXmlPointTable::Found> LandXmlPointTable::find(std::string_view name) const
@@ -41,9 +70,8 @@ std::optional<LandXmlPointTable::Found> LandXmlPointTable::find(std::string_view
     };
     Found found;
     std::string_view next = name;
-    constexpr int longestChain = 100;
     for (int step = 0; step <= longestChain; ++step) {
-        const Known *point = known(next);
+        const auto [point, link] = known(next);
         if (point == nullptr) {
             return std::nullopt;
         }
@@ -51,7 +79,7 @@ std::optional<LandXmlPointTable::Found> LandXmlPointTable::find(std::string_view
         take(found.name, entry.name);
         take(found.code, entry.code);
         take(found.description, entry.description);
-        found.isAmbiguous = found.isAmbiguous || point->isAmbiguous;
+        found.isAmbiguous = found.isAmbiguous || isAmbiguous(*point, link);
         if (entry.position) {
             found.position = *entry.position;
             found.height = entry.height;

@@ -7,6 +7,7 @@
 #include <string>
 #include <string_view>
 #include <unordered_map>
+#include <utility>
 
 namespace kareport
 {
@@ -16,8 +17,8 @@ class LandXmlPointTable
 {
 public:
     /// Adds a point under its name and its identifier. Of several points with one name the first is found. A name counts
-    /// before an identifier: many programs number both, from different points. A point that refers to its own name is the
-    /// same point in another group, and is not added.
+    /// before an identifier: many programs number both, from different points. A point that refers to another one of its own
+    /// name is the same point in another group.
     void add(const LandXmlPoint &point);
 
     /// A point that was found. The texts are empty where it has none, and valid as long as the table.
@@ -44,16 +45,24 @@ private:
         std::string id;
         std::string code;
         std::string description;
+        Entry *nextOfName = nullptr; ///< another point of the name, or of the identifier
+        Entry *nextOfId = nullptr;
     };
     struct Known
     {
         const Entry *entry;
-        bool isAmbiguous;
+        Entry *last;
+        mutable std::optional<bool> isAmbiguous; ///< once it was asked for
     };
     using Entries = std::unordered_map<std::string_view, Known>;
+    using Next = Entry *Entry::*;
 
-    static void addTo(Entries &entries, std::string_view key, const Entry &entry);
-    const Known *known(std::string_view name) const;
+    static constexpr int longestChain = 100; ///< of references
+
+    static void addTo(Entries &entries, std::string_view key, Entry &entry, Next next);
+    std::pair<const Known *, Next> known(std::string_view name) const;
+    const Entry *resolved(const Entry *entry) const;
+    bool isAmbiguous(const Known &known, Next next) const;
 
     std::deque<Entry> points_; ///< they stay where they are
     Entries byName_;

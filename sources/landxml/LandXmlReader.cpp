@@ -37,12 +37,7 @@ XmlHandler::Interest LandXmlReader::startElement(std::string_view name, const Xm
     }
     const Tag tag = tagOf(open_.back().tag, name);
     if (tag == Tag::None) {
-        if (open_.back().tag == Tag::Geometry && name != "Feature") {
-            beginOther(name);
-        } else if (open_.size() > 1 || !isHeader(name)) {
-            notes_.leaveOut(name);
-        }
-        return Interest::None;
+        return leaveOut(name);
     }
     const Interest interest = begin(tag, attributes);
     if (interest != Interest::None) {
@@ -53,6 +48,19 @@ XmlHandler::Interest LandXmlReader::startElement(std::string_view name, const Xm
         }
     }
     return interest;
+}
+
+XmlHandler::Interest LandXmlReader::leaveOut(std::string_view name)
+{
+    if (open_.size() == 1 && isHeader(name)) {
+        return Interest::None;
+    }
+    if (open_.back().tag == Tag::Geometry && name != "Feature") {
+        beginOther(name);
+        return Interest::None;
+    }
+    notes_.leaveOut(name);
+    return Interest::LeftOut;
 }
 
 void LandXmlReader::endElement()
@@ -68,6 +76,10 @@ void LandXmlReader::endElement()
         if (wants_.parcels) {
             parcelPath_.pop_back();
         }
+    } else if (closed.tag == Tag::Alignment) {
+        isInAlignment_ = false;
+    } else if (closed.tag == Tag::GradeModel) {
+        isInGradeModel_ = false;
     }
 }
 
@@ -103,6 +115,7 @@ XmlHandler::Interest LandXmlReader::begin(Tag tag, const XmlAttributes &attribut
     switch (tag) {
     case Tag::Points:
     case Tag::Surface:
+        weigh(leastElement);
         openOwners_.push_back(owners_.size());
         owners_.push_back(textOf(attributes, "name"));
         isSurface_.push_back(tag == Tag::Surface);
@@ -116,6 +129,12 @@ XmlHandler::Interest LandXmlReader::begin(Tag tag, const XmlAttributes &attribut
     case Tag::SurfacePoint: beginPoint(tag, attributes); return Interest::Text;
     case Tag::Parcel: beginParcel(attributes); return Interest::Parts;
     default: break;
+    }
+    if (tag >= Tag::GradeModel && tag <= Tag::ZoneWidth) {
+        if (wants_.gradeSurfaces) {
+            beginInGradeModel(tag, attributes);
+        }
+        return Interest::Parts;
     }
     if (tag < Tag::Alignment || !isGeometryWanted()) {
         return Interest::Parts;
@@ -191,6 +210,7 @@ XmlHandler::Interest LandXmlReader::beginInSections(Tag tag, const XmlAttributes
             notes_.leaveOut("CrossSectPnt " + std::string(*format));
             return Interest::Parts;
         }
+        weigh(leastSectionPoint);
         alignments.back().sections.back().surfaces.back().points.push_back({0, 0, textOf(attributes, "code")});
         return Interest::Text;
     }

@@ -21,6 +21,14 @@ struct LandXmlWants
     bool surfaceLines = false;
     bool sections = false;
     bool parcels = false;
+    bool gradeSurfaces = false; ///< the widths beside alignments
+
+    /// The alignment and the parcel that are asked for by their names; all where a name is empty. A number that cannot be
+    /// read in another one is noted, and is no error.
+    std::string alignment;
+    std::string parcel;
+    /// Whether such a number is noted wherever it is, since names and numbers of elements alone are wanted.
+    bool isTolerant = false;
 };
 
 /// Reads a LandXML file in one pass. Alignments and parcels are kept; points are kept until they are taken, so that a file
@@ -47,6 +55,7 @@ public:
 
     std::vector<LandXmlAlignment> alignments;
     std::vector<LandXmlParcel> parcels;
+    std::vector<LandXmlGradeSurface> gradeSurfaces;
 
 private:
     enum class Tag : unsigned char;
@@ -60,9 +69,11 @@ private:
     void endElement() override;
     void text(std::string_view piece) override;
     void foreignElement(std::string_view name) override;
+    void leftOutElements(std::string_view name, std::size_t count) override { notes_.leaveOut(name, count); }
 
     static Tag tagOf(Tag parent, std::string_view name);
     static bool isHeader(std::string_view name);
+    Interest leaveOut(std::string_view name);
     Interest begin(Tag tag, const XmlAttributes &attributes);
     Interest beginInAlignment(Tag tag, const XmlAttributes &attributes);
     Interest beginInProfile(Tag tag, const XmlAttributes &attributes);
@@ -78,28 +89,24 @@ private:
     void beginSectionSurface(Tag tag, const XmlAttributes &attributes);
     void beginAlignment(const XmlAttributes &attributes);
     void beginParcel(const XmlAttributes &attributes);
+    void beginInGradeModel(Tag tag, const XmlAttributes &attributes);
+    void beginZone(const XmlAttributes &attributes);
+    LandXmlWidth widthOf(const XmlAttributes &attributes);
     void end(Tag tag);
     void addPoint();
     void endPointList(Tag tag);
     LandXmlCoordinates &coordinatesOf(Tag tag);
     LandXmlElement &element();
 
-    double number(const XmlAttributes &attributes, const char *name, double unit, bool mayBeInfinite = false);
-    double length(const XmlAttributes &attributes, const char *name) { return number(attributes, name, units_.metres); }
-    double area(const XmlAttributes &attributes, const char *name)
-    {
-        return number(attributes, name, units_.squareMetres);
-    }
-    /// A radius; that of a line may be infinite.
-    double radius(const XmlAttributes &attributes, const char *name)
-    {
-        return number(attributes, name, units_.metres, true);
-    }
+    bool isNeeded() const;
+    void failNumber(std::size_t byte, const QString &text);
+    double length(const XmlAttributes &attributes, const char *name);
+    double radius(const XmlAttributes &attributes, const char *name);
+    double area(const XmlAttributes &attributes, const char *name);
     double angle(const XmlAttributes &attributes, const char *name, LandXmlAngle form);
-    double direction(const XmlAttributes &attributes, const char *name);
     void startCoordinates(LandXmlCoordinates &at, const XmlAttributes &attributes);
     void weigh(std::size_t bytes);
-    void takeCoordinates(LandXmlCoordinates &at);
+    bool takeCoordinates(LandXmlCoordinates &at);
     bool takeNumbers();
     void takePair(double &first, double &second);
     static std::string textOf(const XmlAttributes &attributes, const char *name);
@@ -123,6 +130,9 @@ private:
     std::vector<std::string> owners_;
     std::vector<bool> isSurface_;         ///< of the owners
     std::vector<std::size_t> openOwners_; ///< their indexes, the innermost last
+    bool isInGradeModel_ = false;         ///< its widths are listed as they are: a wrong one is no error
+    bool isZoneRight_ = false;            ///< the zones that are open
+    bool isInAlignment_ = false;          ///< one that is wanted is open
     int parcelDepth_ = 0;                 ///< parcels that are open
     std::vector<std::size_t> parcelPath_; ///< their indexes, the innermost last, where they are wanted
 };

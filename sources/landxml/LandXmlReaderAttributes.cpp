@@ -1,9 +1,9 @@
 // What the reader takes from the attributes of elements.
 #include "LandXmlReader.h"
 #include "LandXmlTags.h"
-#include "NumberText.h"
 #include "Xlate.h"
 
+#include <algorithm>
 #include <cmath>
 
 namespace kareport
@@ -15,8 +15,10 @@ void LandXmlReader::beginAlignment(const XmlAttributes &attributes)
     LandXmlAlignment &alignment = alignments.emplace_back();
     alignment.name = textOf(attributes, "name");
     alignment.description = textOf(attributes, "desc");
+    isInAlignment_ = true;
     const double start = length(attributes, "staStart");
-    alignment.staStart = std::isnan(start) ? 0 : start;
+    alignment.isStartStated = !std::isnan(start);
+    alignment.staStart = alignment.isStartStated ? start : 0;
     alignment.length = length(attributes, "length");
     alignment.byte = stream_.currentByte();
 }
@@ -50,8 +52,7 @@ void LandXmlReader::beginPoint(Tag tag, const XmlAttributes &attributes)
     point.at.byte = stream_.currentByte();
 }
 
-/// Begins coordinates, without the name that they may have.
-
+/// Begins coordinates, without the position that they may have.
 void LandXmlReader::startCoordinates(LandXmlCoordinates &at, const XmlAttributes &attributes)
 {
     at.position.reset();
@@ -97,8 +98,8 @@ void LandXmlReader::beginElement(Tag tag, const XmlAttributes &attributes)
     element.radiusStart = radius(attributes, "radiusStart");
     element.radiusEnd = radius(attributes, "radiusEnd");
     element.staStart = length(attributes, "staStart");
-    element.direction = direction(attributes, tag == Tag::Line ? "dir" : "dirStart");
-    element.directionEnd = direction(attributes, "dirEnd");
+    element.direction = angle(attributes, tag == Tag::Line ? "dir" : "dirStart", units_.direction);
+    element.directionEnd = angle(attributes, "dirEnd", units_.direction);
     element.delta = angle(attributes, "delta", units_.angle);
 }
 
@@ -118,6 +119,7 @@ void LandXmlReader::beginOther(std::string_view name)
 
 void LandXmlReader::beginEquation(const XmlAttributes &attributes)
 {
+    weigh(leastElement);
     LandXmlEquation &equation = alignments.back().equations.emplace_back();
     equation.internal = length(attributes, "staInternal");
     equation.back = length(attributes, "staBack");
@@ -128,6 +130,7 @@ void LandXmlReader::beginEquation(const XmlAttributes &attributes)
 
 void LandXmlReader::beginGradePoint(Tag tag, const XmlAttributes &attributes)
 {
+    weigh(leastGradePoint);
     LandXmlGradePoint &point = alignments.back().gradeLines.back().points.emplace_back();
     using Kind = LandXmlGradePoint::Kind;
     point.kind = tag == Tag::GradePoint            ? Kind::Point
@@ -151,13 +154,14 @@ void LandXmlReader::beginSection(const XmlAttributes &attributes)
     section.fillArea = area(attributes, "areaFill");
     const double skew = angle(attributes, "angleSkew", units_.angle);
     section.byte = stream_.currentByte();
-    if (std::fabs(skew) > 0) {
+    const bool isUnknown = std::isnan(skew) && !attributes.text("angleSkew").empty();
+    if (std::fabs(skew) > 0 || isUnknown) {
         section.isSkew = true;
         notes_.add(section.byte,
                    Xlate("not supported: coordinates of a cross section that lies at a skew to its alignment"));
     }
     if (std::isnan(section.station)) {
-        stream_.fail(section.byte, Xlate("the attribute %1 was expected").arg(QStringLiteral("sta")));
+        failNumber(section.byte, Xlate("the attribute %1 was expected").arg(QStringLiteral("sta")));
     }
 }
 
@@ -182,57 +186,13 @@ void LandXmlReader::beginParcel(const XmlAttributes &attributes)
     }
     const std::string owner = parcelPath_.empty() ? std::string() : parcels[parcelPath_.back()].name;
     parcelPath_.push_back(parcels.size());
-    weigh(leastElement);
+    weigh(std::max(leastElement, owner.size())); // each part has its own copy
     LandXmlParcel &parcel = parcels.emplace_back();
     parcel.owner = owner;
     parcel.name = textOf(attributes, "name");
     parcel.description = textOf(attributes, "desc");
     parcel.area = area(attributes, "area");
     parcel.byte = stream_.currentByte();
-}
-
-/// A number in the file's unit, which is given in ours; not a number where the attribute is missing.
-double LandXmlReader::number(const XmlAttributes &attributes, const char *name, double unit, bool mayBeInfinite)
-{
-    const auto value = attributes.find(name);
-    if (!value || value->empty()) {
-        return notGiven;
-    }
-    double number = notGiven;
-    const bool isNumber = parseNumber(*value, number) && !std::isnan(number);
-    number *= unit;
-    if (!isNumber || (std::isinf(number) && !mayBeInfinite)) {
-        stream_.fail(stream_.currentByte(), Xlate("the attribute %1=\"%2\" does not fit: a number was expected")
-                                                .arg(QString::fromUtf8(name), quoteOf(*value)));
-    }
-    return number;
-}
-
-/// A direction, which is only compared with the geometry: one that cannot be read is noted.
-double LandXmlReader::direction(const XmlAttributes &attributes, const char *name)
-{
-    const auto value = attributes.find(name);
-    double radians = notGiven;
-    if (value && !value->empty() && !parseLandXmlAngle(*value, units_.direction, radians)) {
-        notes_.add(stream_.currentByte(), Xlate("the attribute %1=\"%2\" does not fit: an angle in the file's unit was "
-                                                "expected")
-                                              .arg(QString::fromUtf8(name), quoteOf(*value)));
-        return notGiven;
-    }
-    return radians;
-}
-
-double LandXmlReader::angle(const XmlAttributes &attributes, const char *name, LandXmlAngle form)
-{
-    const auto value = attributes.find(name);
-    double radians = notGiven;
-    if (value && !value->empty() && !parseLandXmlAngle(*value, form, radians)) {
-        stream_.fail(stream_.currentByte(),
-                     Xlate("the attribute %1=\"%2\" does not fit: an angle in the file's unit was "
-                           "expected")
-                         .arg(QString::fromUtf8(name), quoteOf(*value)));
-    }
-    return radians;
 }
 
 std::string LandXmlReader::textOf(const XmlAttributes &attributes, const char *name)

@@ -32,8 +32,7 @@ void LandXmlReader::end(Tag tag)
     switch (tag) {
     case Tag::Point:
     case Tag::SurfacePoint:
-        takeCoordinates(points_[pointCount_].at);
-        if (!stream_.error()) {
+        if (takeCoordinates(points_[pointCount_].at)) {
             addPoint();
         }
         break;
@@ -109,8 +108,8 @@ bool LandXmlReader::takeNumbers()
             while (last != end && !isBlank(*last)) {
                 ++last;
             }
-            stream_.fail(textByte_, Xlate("\"%1\" does not fit: a number was expected")
-                                        .arg(quoteOf({begin, static_cast<std::size_t>(last - begin)})));
+            failNumber(textByte_, Xlate("\"%1\" does not fit: a number was expected")
+                                      .arg(quoteOf({begin, static_cast<std::size_t>(last - begin)})));
             return false;
         }
         numbers_.push_back(isNegative ? -number : number);
@@ -122,24 +121,26 @@ bool LandXmlReader::takeNumbers()
     return true;
 }
 
-void LandXmlReader::takeCoordinates(LandXmlCoordinates &at)
+/// Takes the text as coordinates. @return whether it is some, or a reference stands for them
+bool LandXmlReader::takeCoordinates(LandXmlCoordinates &at)
 {
     if (!takeNumbers()) {
-        return;
+        return false;
     }
     if (numbers_.empty() && !at.reference.empty()) {
-        return;
+        return true;
     }
     if (numbers_.size() != 2 && numbers_.size() != 3) {
-        stream_.fail(textByte_, Xlate("the coordinates \"%1\" do not fit: northing, easting and perhaps a height were "
-                                      "expected")
-                                    .arg(quoteOf(text_)));
-        return;
+        failNumber(textByte_, Xlate("the coordinates \"%1\" do not fit: northing, easting and perhaps a height were "
+                                    "expected")
+                                  .arg(quoteOf(text_)));
+        return false;
     }
     at.position = PlanePoint{numbers_[0] * units_.metres, numbers_[1] * units_.metres};
     if (numbers_.size() == 3) {
         at.height = numbers_[2] * units_.metres;
     }
+    return true;
 }
 
 void LandXmlReader::takePair(double &first, double &second)
@@ -148,7 +149,7 @@ void LandXmlReader::takePair(double &first, double &second)
         return;
     }
     if (numbers_.size() != 2) {
-        stream_.fail(textByte_, Xlate("\"%1\" does not fit: two numbers were expected").arg(quoteOf(text_)));
+        failNumber(textByte_, Xlate("\"%1\" does not fit: two numbers were expected").arg(quoteOf(text_)));
         return;
     }
     first = numbers_[0] * units_.metres;
@@ -168,9 +169,8 @@ void LandXmlReader::endPointList(Tag tag)
     if (owner == Tag::SurfaceLine) {
         LandXmlHeightLine &line = alignments.back().surfaceLines.back();
         line.pieces.push_back(line.points.size());
-    } else if (owner == Tag::IrregularLine) {
-        weigh(leastPoint * (numbers_.size() / each));
     }
+    weigh((owner == Tag::IrregularLine ? leastPoint : leastPair) * (numbers_.size() / each));
     for (std::size_t i = 0; i + each <= numbers_.size(); i += each) {
         const double first = numbers_[i] * units_.metres;
         const double second = numbers_[i + 1] * units_.metres;

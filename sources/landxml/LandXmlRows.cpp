@@ -1,6 +1,7 @@
 #include "LandXmlRows.h"
 
 #include "AlignmentRows.h"
+#include "CourseRows.h"
 #include "ElementRows.h"
 #include "LandXmlReferences.h"
 #include "ParcelRows.h"
@@ -54,6 +55,20 @@ constexpr bool areInOrder()
 }
 static_assert(areInOrder());
 
+/// What the name of a query of a kind is that of.
+LandXmlNames::Of namesFor(Kind kind)
+{
+    using Of = LandXmlNames::Of;
+    switch (kind) {
+    case Kind::Points:
+    case Kind::OffsetsOf: return Of::Group;
+    case Kind::SurfacePoints: return Of::Surface;
+    case Kind::Parcels:
+    case Kind::Courses: return Of::Parcel;
+    default: return Of::Alignment;
+    }
+}
+
 } // namespace
 
 std::optional<LandXmlListKind> landXmlListFromKey(QStringView key)
@@ -90,9 +105,9 @@ std::unique_ptr<LandXmlRows> LandXmlRows::make(LandXmlSource source)
 
 LandXmlRows::LandXmlRows(LandXmlSource source)
     : source_(std::move(source)),
-      names_(source_.query.name),
-      gradeLines_(source_.query.gradeLine),
-      surfaces_(source_.query.surface),
+      names_(namesFor(source_.query.kind), source_.query.name),
+      gradeLines_(LandXmlNames::Of::GradeLine, source_.query.gradeLine),
+      surfaces_(LandXmlNames::Of::Surface, source_.query.surface),
       modelNotes_(source_.file),
       passNotes_(source_.file)
 {
@@ -160,12 +175,15 @@ std::unique_ptr<LandXmlReader> LandXmlRows::readAll(const LandXmlWants &wants)
 
 bool LandXmlRows::readAlignments(AlignmentModel &model, LandXmlWants wants)
 {
+    const LandXmlQuery &query = source_.query;
     wants.alignments = true;
+    wants.alignment = (query.kind == Kind::OffsetsOf ? query.alignment : query.name).toStdString();
     const auto reader = readAll(wants);
     if (!reader) {
         return false;
     }
     model.alignments = std::move(reader->alignments);
+    model.widths.fill(reader->gradeSurfaces, model.alignments, modelNotes_);
     return true;
 }
 

@@ -8,6 +8,7 @@
 #include "LandXmlRoute.h"
 #include "LandXmlUnits.h"
 #include "LandXmlValue.h"
+#include "LandXmlWidths.h"
 #include "RowList.h"
 
 #include <QString>
@@ -31,10 +32,11 @@ struct LandXmlSource
     double unit = 1; ///< metres in the unit of lengths that the query was asked in, for messages
 };
 
-/// The alignments of a file, and the geometry of those that are wanted.
+/// The alignments of a file, and the geometry of those that are asked for.
 struct AlignmentModel
 {
     std::vector<LandXmlAlignment> alignments;
+    LandXmlWidthTable widths; ///< where they are wanted
     std::vector<LandXmlRoute> routes;
 };
 

@@ -8,6 +8,9 @@ namespace kareport
 /// Bytes that elements take in a file at the least, and points in a list of numbers.
 inline constexpr std::size_t leastElement = 40;
 inline constexpr std::size_t leastPoint = 12;
+inline constexpr std::size_t leastPair = 8; ///< a point of a profile or a section
+inline constexpr std::size_t leastGradePoint = 20;
+inline constexpr std::size_t leastSectionPoint = 30;
 
 /// What an element is, by its name and what it is in. Those of an alignment follow each other, and among them those of a
 /// profile and those of cross sections: the reader compares their order.
@@ -49,6 +52,11 @@ enum class LandXmlReader::Tag : unsigned char
     SectionSurface,
     DesignSectionSurface,
     SectionPoint,
+    GradeModel,
+    GradeSurface,
+    Zones,
+    Zone,
+    ZoneWidth,
     Parcels,
     Parcel
 };

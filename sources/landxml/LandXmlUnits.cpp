@@ -108,6 +108,7 @@ public:
     void endElement() override { --depth_; }
     void text(std::string_view) override {}
     void foreignElement(std::string_view) override {}
+    void leftOutElements(std::string_view, std::size_t) override {}
 
 private:
     static QString textOf(std::string_view text)

@@ -64,6 +64,12 @@ inline double radiusOf(double curvature)
     return curvature == 0 ? std::numeric_limits<double>::infinity() : std::fabs(1 / curvature);
 }
 
+/// The radius of a curvature, positive to the right; infinite where it is straight, which is on neither side.
+inline double signedRadiusOf(double curvature)
+{
+    return std::copysign(radiusOf(curvature), curvature == 0 ? 1 : curvature);
+}
+
 /// A variable that rows have.
 struct LandXmlVariable
 {

@@ -158,14 +158,15 @@ bool PointRows::take()
 }
 
 /// Notes names that several points have. Others refer to points by their names, so that each is expected to have its own; in
-/// a surface as well. A point that refers to its own name is the same point in another group.
+/// a surface as well. A point that refers to one of its own name is the same point in another group.
 void PointRows::noteNames()
 {
     const std::string &reference = point_->at.reference;
     if (referred_ && referred_->isAmbiguous) {
         noteAmbiguous(reference, point_->at.byte, passNotes_);
     }
-    if (point_->name.empty() || (referred_ && reference == point_->name)) {
+    const bool isAlias = referred_ && (reference == point_->name || referred_->name == point_->name);
+    if (point_->name.empty() || isAlias) {
         return;
     }
     if (!seen_.add(hashes_[index_ - 1])) {

@@ -92,7 +92,7 @@ bool ProjectedRows::load()
 LandXmlAlignment *ProjectedRows::chooseAlignment()
 {
     LandXmlAlignment *chosen = nullptr;
-    LandXmlNames names(source_.query.alignment);
+    LandXmlNames names(LandXmlNames::Of::Alignment, source_.query.alignment);
     for (LandXmlAlignment &alignment : model_.alignments) {
         if (!names.matches(alignment.name)) {
             continue;
@@ -100,6 +100,11 @@ LandXmlAlignment *ProjectedRows::chooseAlignment()
         if (chosen != nullptr && source_.query.alignment.isEmpty()) {
             fail(alignment.byte, Xlate("the file has several alignments: the name of one was expected"));
             return nullptr;
+        }
+        if (chosen != nullptr) {
+            modelNotes_.add(
+                alignment.byte,
+                Xlate("several alignments have the name \"%1\": the first one was taken").arg(source_.query.alignment));
         }
         chosen = chosen == nullptr ? &alignment : chosen;
     }

@@ -1,6 +1,7 @@
 #include "SectionRows.h"
 
 #include "VariableType.h"
+#include "Xlate.h"
 
 namespace kareport
 {
@@ -15,6 +16,12 @@ struct SectionRows::Variables
             return {};
         }
         return valueOf(pointBeside(rows.place_->point, rows.place_->bearing, point(rows).offset).*part);
+    }
+
+    static LandXmlValue width(const Rows &rows, bool isRight)
+    {
+        const LandXmlWidths *widths = rows.model_.widths.find(rows.route_->stored->name);
+        return widths != nullptr ? valueOf(widths->at(rows.section_->station, isRight)) : LandXmlValue();
     }
 
     static constexpr LandXmlGetter<Rows> getters[] = {
@@ -35,6 +42,8 @@ struct SectionRows::Variables
         {"Easting", VARIABLE_COORDINATE, [](const Rows &rows) { return coordinate(rows, &PlanePoint::easting); }},
         {"Width", VARIABLE_LENGTH, [](const Rows &rows) { return valueOf(rows.surface_->width); }},
         {"Thickness", VARIABLE_LENGTH, [](const Rows &rows) { return valueOf(rows.surface_->thickness); }},
+        {"LeftWidth", VARIABLE_LENGTH, [](const Rows &rows) { return width(rows, false); }},
+        {"RightWidth", VARIABLE_LENGTH, [](const Rows &rows) { return width(rows, true); }},
         {"CutArea", VARIABLE_AREA, [](const Rows &rows) { return valueOf(rows.section_->cutArea); }},
         {"FillArea", VARIABLE_AREA, [](const Rows &rows) { return valueOf(rows.section_->fillArea); }},
     };
@@ -54,11 +63,13 @@ bool SectionRows::load()
 {
     LandXmlWants wants;
     wants.sections = true;
+    wants.gradeSurfaces = true;
     if (!readNamedAlignments(model_, wants)) {
         return false;
     }
     for (const LandXmlRoute &route : model_.routes) {
         for (const LandXmlSection &section : route.stored->sections) {
+            noteStation(route, section);
             for (const LandXmlSectionSurface &layer : section.surfaces) {
                 const std::size_t points = surfaces_.matches(layer.name) ? layer.points.size() : 0;
                 for (std::size_t i = 0; i < points; ++i) {
@@ -69,6 +80,17 @@ bool SectionRows::load()
     }
     count_ = rows_.size();
     return expectNames();
+}
+
+/// Notes a section that is beyond the ends of its alignment: its points have no coordinates.
+void SectionRows::noteStation(const LandXmlRoute &route, const LandXmlSection &section)
+{
+    const bool isBeside = !route.fault && !route.alignment.elements().empty();
+    if (isBeside && !route.alignment.at(section.station - route.stationing.start())) {
+        modelNotes_.add(section.byte,
+                        Xlate("the cross section is before the start or after the end of the alignment: its "
+                              "points have no coordinates"));
+    }
 }
 
 void SectionRows::take(std::size_t index)

@@ -29,6 +29,8 @@ private:
         std::size_t point;
     };
 
+    void noteStation(const LandXmlRoute &route, const LandXmlSection &section);
+
     AlignmentModel model_;
     std::vector<Row> rows_;
     const LandXmlRoute *route_ = nullptr;

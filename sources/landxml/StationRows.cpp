@@ -49,6 +49,11 @@ struct StationRows::Variables
         return valueOf(isEnd ? element.end.name : element.start.name);
     }
 
+    static LandXmlValue width(const Rows &rows, bool isRight)
+    {
+        return valueOf(rows.widthAt(rows.distance_ + rows.route_->stationing.start(), isRight));
+    }
+
     static constexpr LandXmlGetter<Rows> getters[] = {
         {"Alignment", VARIABLE_TEXT, [](const Rows &rows) { return valueOf(rows.route_->stored->name); }},
         {"Station", VARIABLE_STATION, [](const Rows &rows) { return valueOf(name(rows).station); }},
@@ -65,8 +70,7 @@ struct StationRows::Variables
         {"Bearing", VARIABLE_BEARING, [](const Rows &rows) { return bearingOf(rows.place_); }},
         {"Radius", VARIABLE_LENGTH,
          [](const Rows &rows) {
-             return rows.place_ ? valueOf(std::copysign(radiusOf(rows.place_->curvature), rows.place_->curvature))
-                                : LandXmlValue();
+             return rows.place_ ? valueOf(signedRadiusOf(rows.place_->curvature)) : LandXmlValue();
          }},
         {"Design", VARIABLE_ELEVATION, [](const Rows &rows) { return valueOf(rows.design_); }},
         {"Grade", VARIABLE_DOUBLE,
@@ -76,6 +80,8 @@ struct StationRows::Variables
          [](const Rows &rows) {
              return rows.design_ && rows.ground_ ? valueOf(*rows.design_ - *rows.ground_) : LandXmlValue();
          }},
+        {"LeftWidth", VARIABLE_LENGTH, [](const Rows &rows) { return width(rows, false); }},
+        {"RightWidth", VARIABLE_LENGTH, [](const Rows &rows) { return width(rows, true); }},
     };
 };
 
@@ -115,6 +121,7 @@ bool StationRows::load()
 {
     LandXmlWants wants;
     wants.surfaceLines = true;
+    wants.gradeSurfaces = true;
     if (!readNamedAlignments(model_, wants)) {
         return false;
     }
@@ -122,7 +129,7 @@ bool StationRows::load()
     const std::string surface = source_.query.surface.toStdString();
     for (std::size_t i = 0; i < model_.routes.size(); ++i) {
         const LandXmlRoute &route = model_.routes[i];
-        lines_.push_back({route.profile(gradeLine), route.surface(surface)});
+        lines_.push_back({route.profile(gradeLine), route.surface(surface), model_.widths.find(route.stored->name)});
         lookAtNames(*route.stored);
         if (!addRoute(i)) {
             return false;
@@ -151,6 +158,7 @@ bool StationRows::addRoute(std::size_t index)
         return false;
     }
     if (route.alignment.elements().empty()) {
+        modelNotes_.add(route.stored->byte, Xlate("the alignment has no elements, and therefore no stations"));
         return true;
     }
     noteOffsetsPastCentres(route);
@@ -201,9 +209,16 @@ const LandXmlRoute::Piece *StationRows::borderAt(double distance, bool &isEnd) c
     return isEnd ? &pieces.back() : nullptr;
 }
 
+double StationRows::widthAt(double internal, bool isRight) const
+{
+    const LandXmlWidths *widths = lines_[rowRoute_].widths;
+    return widths != nullptr ? widths->at(internal, isRight) : notGiven;
+}
+
 void StationRows::take(std::size_t index)
 {
     const Row &row = rows_[index];
+    rowRoute_ = row.route;
     route_ = &model_.routes[row.route];
     distance_ = row.distance;
     // The lengths of many curves add up to an end that differs by their last digits.

@@ -33,17 +33,20 @@ private:
     {
         const VerticalProfile *profile;
         const LandXmlHeightLine *surface;
+        const LandXmlWidths *widths;
     };
 
     void lookAtNames(const LandXmlAlignment &alignment);
     bool addRoute(std::size_t index);
     void noteOffsetsPastCentres(const LandXmlRoute &route);
     const LandXmlRoute::Piece *borderAt(double distance, bool &isEnd) const;
+    double widthAt(double internal, bool isRight) const;
     LandXmlValue offsetValue(std::size_t offset, std::size_t variable) const;
 
     AlignmentModel model_;
     std::vector<Lines> lines_; ///< one for each route
     std::vector<Row> rows_;
+    std::size_t rowRoute_ = 0; ///< of the row at hand
     const LandXmlRoute *route_ = nullptr;
     double distance_ = 0;
     std::optional<CurvePlace> place_;

@@ -1,7 +1,7 @@
 #include "XmlStream.h"
 
-#include "Windows1252.h"
 #include "Xlate.h"
+#include "XmlStreamCallbacks.h"
 
 #include <algorithm>
 #include <expat.h>
@@ -15,12 +15,6 @@ namespace
 
 constexpr std::size_t blockSize = std::size_t(1) << 16;
 
-QString utf8(std::string_view text)
-{
-    constexpr std::size_t longest = 200;
-    return QString::fromUtf8(text.data(), static_cast<qsizetype>(std::min(text.size(), longest)));
-}
-
 } // namespace
 
 std::optional<std::string_view> XmlAttributes::find(std::string_view name) const
@@ -33,90 +27,6 @@ std::optional<std::string_view> XmlAttributes::find(std::string_view name) const
     }
     return std::nullopt;
 }
-
-/// What the parser calls. An exception must not pass through it: it is kept until the parser has come back.
-struct XmlStream::Callbacks
-{
-    template <typename Function>
-    static void guarded(void *data, const Function &function)
-    {
-        auto &stream = *static_cast<XmlStream *>(data);
-        if (stream.isStopped_) {
-            return; // the parser ends what it has begun
-        }
-        try {
-            function(stream);
-        } catch (...) {
-            stream.thrown_ = std::current_exception();
-            stream.stop();
-        }
-    }
-
-    static void start(void *data, const char *name, const char **attributes)
-    {
-        guarded(data, [&](XmlStream &stream) { stream.started(name, attributes); });
-    }
-
-    static void end(void *data, const char *)
-    {
-        guarded(data, [](XmlStream &stream) { stream.ended(); });
-    }
-
-    static void text(void *data, const char *characters, int count)
-    {
-        guarded(data, [&](XmlStream &stream) { stream.handler_.text({characters, static_cast<std::size_t>(count)}); });
-    }
-
-    static void documentType(void *data, const char *, const char *file, const char *, int)
-    {
-        if (file != nullptr) {
-            guarded(data, [&](XmlStream &stream) {
-                stream.fail(stream.currentByte(),
-                            Xlate("the document type is in another file, \"%1\", which is not read: "
-                                  "a file that needs no other was expected")
-                                .arg(utf8(file)));
-            });
-        }
-    }
-
-    static void entity(void *data, const char *name, int, const char *, int, const char *, const char *, const char *,
-                       const char *)
-    {
-        guarded(data, [&](XmlStream &stream) {
-            stream.fail(
-                stream.currentByte(),
-                Xlate("the file declares the entity \"%1\": a file without entities was expected").arg(utf8(name)));
-        });
-    }
-
-    static void skippedEntity(void *data, const char *name, int)
-    {
-        guarded(data, [&](XmlStream &stream) {
-            stream.fail(stream.currentByte(), Xlate("the entity \"%1\" is not known").arg(utf8(name)));
-        });
-    }
-
-    static int encoding(void *, const char *name, XML_Encoding *encoding)
-    {
-        std::string folded(name);
-        std::transform(folded.begin(), folded.end(), folded.begin(), [](char letter) {
-            return letter >= 'A' && letter <= 'Z' ? static_cast<char>(letter + 32) : letter;
-        });
-        if (folded != "windows-1252" && folded != "cp1252") {
-            return XML_STATUS_ERROR;
-        }
-        for (int i = 0; i < 256; ++i) {
-            encoding->map[i] = i;
-        }
-        for (std::size_t i = 0; i < windows1252.size(); ++i) {
-            encoding->map[0x80 + i] = windows1252[i] != 0 ? windows1252[i] : -1;
-        }
-        encoding->data = nullptr;
-        encoding->convert = nullptr;
-        encoding->release = nullptr;
-        return XML_STATUS_OK;
-    }
-};
 
 XmlStream::XmlStream(std::shared_ptr<const FileBytes> file, XmlHandler &handler)
     : file_(std::move(file)), handler_(handler), parser_(XML_ParserCreate(nullptr))
@@ -207,6 +117,9 @@ void XmlStream::started(const char *name, const char *const *attributes)
         return;
     }
     if (leftOutFrom_ != 0) {
+        if (isLeftOutTold_) {
+            countLeftOut(name);
+        }
         return;
     }
     wantText(false);
@@ -214,15 +127,23 @@ void XmlStream::started(const char *name, const char *const *attributes)
     vocabulary_.begin(name, attributes, depth_);
     if (!vocabulary_.has(name)) {
         handler_.foreignElement(name);
-        leftOutFrom_ = depth_;
+        leaveOut(true, true);
         return;
     }
     const auto interest = handler_.startElement(XmlVocabulary::withoutPrefix(name), found);
     wantText(interest == XmlHandler::Interest::Text);
     textWanted_.set(static_cast<std::size_t>(depth_), wantsText_);
-    if (interest == XmlHandler::Interest::None) {
-        leftOutFrom_ = depth_;
+    if (interest <= XmlHandler::Interest::LeftOut) {
+        leaveOut(interest == XmlHandler::Interest::LeftOut, false);
     }
+}
+
+/// Leaves out all that is in the element at hand. @param isTold  but for the names of its elements
+void XmlStream::leaveOut(bool isTold, bool isForeign)
+{
+    leftOutFrom_ = depth_;
+    isLeftOutTold_ = isTold;
+    isLeftOutForeign_ = isForeign;
 }
 
 void XmlStream::ended()
@@ -231,11 +152,31 @@ void XmlStream::ended()
         handler_.endElement();
     } else if (leftOutFrom_ == depth_) {
         leftOutFrom_ = 0;
+        tellLeftOut();
     }
     vocabulary_.end(depth_);
     --depth_;
     // The text after an element belongs to the one around it.
     wantText(leftOutFrom_ == 0 && textWanted_.test(static_cast<std::size_t>(depth_)));
+}
+
+/// Counts an element in one that is left out. Millions of one name follow each other in a large file.
+void XmlStream::countLeftOut(const char *name)
+{
+    if (leftOutName_ != name) {
+        tellLeftOut();
+        leftOutName_ = name;
+    }
+    ++leftOutCount_;
+}
+
+void XmlStream::tellLeftOut()
+{
+    if (leftOutCount_ > 0) {
+        const std::string_view name = leftOutName_;
+        handler_.leftOutElements(isLeftOutForeign_ ? name : XmlVocabulary::withoutPrefix(name), leftOutCount_);
+        leftOutCount_ = 0;
+    }
 }
 
 /// Has the parser tell text or leave it out: most text of a file belongs to elements of which nothing is wanted.

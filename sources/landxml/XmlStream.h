@@ -11,6 +11,7 @@
 #include <exception>
 #include <memory>
 #include <optional>
+#include <string>
 #include <string_view>
 
 struct XML_ParserStruct;
@@ -42,9 +43,10 @@ class XmlHandler
 public:
     enum class Interest
     {
-        None,  ///< nothing of what is in the element
-        Parts, ///< the elements in it
-        Text   ///< the text in it as well
+        None,    ///< nothing of what is in the element
+        LeftOut, ///< the names of all elements in it, by `leftOutElements`
+        Parts,   ///< the elements in it
+        Text     ///< the text in it as well
     };
 
     virtual ~XmlHandler() = default;
@@ -54,8 +56,11 @@ public:
     virtual void endElement() = 0;
     /// A piece of text in the innermost element. There may be elements between two pieces.
     virtual void text(std::string_view piece) = 0;
-    /// An element of another vocabulary, which is skipped with all in it. @param name  with its prefix
+    /// An element of another vocabulary, which is left out with all in it. @param name  with its prefix
     virtual void foreignElement(std::string_view name) = 0;
+    /// Elements of one name that follow each other in one that is left out, however deep.
+    /// @param name  with the prefix of another vocabulary
+    virtual void leftOutElements(std::string_view name, std::size_t count) = 0;
 };
 
 /// Reads an XML file from start to end in one pass, without a document in memory. What belongs to the vocabulary of the
@@ -94,6 +99,9 @@ private:
 
     void started(const char *name, const char *const *attributes);
     void ended();
+    void leaveOut(bool isTold, bool isForeign);
+    void countLeftOut(const char *name);
+    void tellLeftOut();
     void wantText(bool isWanted);
     void failParsing();
 
@@ -103,7 +111,11 @@ private:
     XmlVocabulary vocabulary_;
     std::size_t position_ = 0;
     int depth_ = 0;
-    int leftOutFrom_ = 0;                 ///< depth of the element that is left out; 0 when there is none
+    int leftOutFrom_ = 0;           ///< depth of the element that is left out; 0 when there is none
+    bool isLeftOutTold_ = false;    ///< the elements in that are told
+    bool isLeftOutForeign_ = false; ///< it is of another vocabulary
+    std::string leftOutName_;       ///< of the elements in it that are counted
+    std::size_t leftOutCount_ = 0;
     bool wantsText_ = false;              ///< of the innermost element
     std::bitset<deepest + 1> textWanted_; ///< of the elements that are open, by their depth
     bool isStopped_ = false;

@@ -236,6 +236,36 @@ TEST_F(TemplateDialogs, OffersTheListsAndTheNamesOfALandXmlFile)
     EXPECT_EQ(dialog.job().dataOptions, QJsonObject());
 }
 
+TEST_F(TemplateDialogs, NamesOfALandXmlFileAreThoseOfTheListAndOfTheAlignment)
+{
+    folder.put("roads.xml",
+               QByteArray(roads()).replace("</Profile></Alignment>",
+                                           "</Profile><CrossSects><CrossSect sta='5'><CrossSectSurf name='rock'>"
+                                           "<PntList2D>0 1</PntList2D></CrossSectSurf></CrossSect></CrossSects>"
+                                           "</Alignment><Alignment name='empty'/>"));
+    TemplateDialog dialog;
+    dialog.setTemplateFile(folder.path("t.xml"));
+    dialog.setData(folder.path("roads.xml"));
+    const QString all = u"(all)"_qs;
+    const QString first = u"(the first)"_qs;
+    press(dialog, "List", "Stations");
+    EXPECT_EQ(itemsOf(dialog, "Alignment"), QStringList({all, u"road"_qs, u"lane"_qs})) << "those with elements";
+    EXPECT_EQ(itemsOf(dialog, "Surface"), QStringList({first, u"ground"_qs})) << "along the alignments";
+    press(dialog, "Alignment", "lane");
+    EXPECT_EQ(itemsOf(dialog, "Grade line"), QStringList(first)) << "of another alignment";
+    EXPECT_EQ(itemsOf(dialog, "Surface"), QStringList(first));
+    press(dialog, "Alignment", "road");
+    press(dialog, "Grade line", "design");
+    EXPECT_EQ(dialog.job().dataOptions.value(u"gradeLine"_qs).toString(), u"design");
+    press(dialog, "List", "Cross sections");
+    EXPECT_EQ(itemsOf(dialog, "Alignment"), QStringList({all, u"road"_qs})) << "those with cross sections";
+    EXPECT_EQ(itemsOf(dialog, "Surface"), QStringList({all, u"rock"_qs})) << "across the alignments";
+    press(dialog, "List", "Profile");
+    EXPECT_EQ(itemsOf(dialog, "Alignment"), QStringList({all, u"road"_qs})) << "those with grade lines";
+    press(dialog, "List", "Alignments");
+    EXPECT_EQ(itemsOf(dialog, "Alignment"), QStringList({all, u"road"_qs, u"empty"_qs, u"lane"_qs}));
+}
+
 TEST_F(TemplateDialogs, ALandXmlFileThatCannotBeReadIsSaid)
 {
     struct Row

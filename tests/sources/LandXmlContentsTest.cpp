@@ -38,9 +38,14 @@ TEST(LandXmlContents, AreTheNamesInTheFileWithTheNumberOfWhatIsInThem)
     EXPECT_EQ(contents.version, QStringLiteral("1.2"));
     EXPECT_EQ(textOf(contents.groups), QStringLiteral("control 2"));
     EXPECT_EQ(textOf(contents.surfaces), QStringLiteral("ground 1"));
-    EXPECT_EQ(textOf(contents.alignments), QStringLiteral("road 3"));
-    EXPECT_EQ(textOf(contents.gradeLines), QStringLiteral("design 2"));
-    EXPECT_EQ(textOf(contents.surfaceLines), QStringLiteral("ground 3|rock 1"));
+    ASSERT_EQ(contents.alignments.size(), 1U);
+    const LandXmlContents::Alignment &road = contents.alignments.front();
+    EXPECT_EQ(road.name, u"road");
+    EXPECT_EQ(road.elements, 3U);
+    EXPECT_EQ(road.sections, 1U);
+    EXPECT_EQ(textOf(road.gradeLines), QStringLiteral("design 2"));
+    EXPECT_EQ(textOf(road.surfacesAlong), QStringLiteral("ground 2"));
+    EXPECT_EQ(textOf(road.surfacesAcross), QStringLiteral("ground 1|rock 1"));
     EXPECT_EQ(textOf(contents.parcels), QStringLiteral("7 1"));
 }
 

@@ -155,6 +155,35 @@ TEST(LandXmlHostile, ElementsWithoutContentDoNotFillTheMemory)
         ASSERT_TRUE(file.list->error()) << keyOf(kind).toString().toStdString();
         EXPECT_TRUE(file.list->error()->text.contains(u"too many elements without content"));
     }
+    const auto inAlignment = [](const QByteArray &content) {
+        return "<Alignments><Alignment>" + content + "</Alignment></Alignments>";
+    };
+    const QByteArray pairs = "<PntList2D>" + QByteArray("0 0 ").repeated(400000) + "</PntList2D>";
+    for (const auto &[kind, content] :
+         {std::pair(Kind::Stations, inAlignment("<Profile><ProfSurf>" + pairs + "</ProfSurf></Profile>")),
+          std::pair(Kind::CrossSections, inAlignment("<CrossSects><CrossSect sta='1'><CrossSectSurf>" + pairs +
+                                                     "</CrossSectSurf></CrossSect></CrossSects>")),
+          std::pair(Kind::Profile, inAlignment("<Profile><ProfAlign>" + QByteArray("<PVI>0 1</PVI>").repeated(300000) +
+                                               "</ProfAlign></Profile>")),
+          std::pair(Kind::Alignments, inAlignment(QByteArray("<StaEquation/>").repeated(100000))),
+          std::pair(Kind::Points, QByteArray("<CgPoints/>").repeated(100000)),
+          std::pair(Kind::CrossSections, inAlignment("<CrossSects><CrossSect sta='1'><DesignCrossSectSurf>" +
+                                                     QByteArray("<CrossSectPnt/>").repeated(100000) +
+                                                     "</DesignCrossSectSurf></CrossSect></CrossSects>"))})
+    {
+        // Of an alignment that is not asked for: there an empty element is no error in itself.
+        LandXmlFile file(fileOf(content), queryOf(kind, kind == Kind::Points ? "" : "another"));
+        EXPECT_EQ(file.rows(), QStringList());
+        ASSERT_TRUE(file.list->error()) << keyOf(kind).toString().toStdString();
+        EXPECT_TRUE(file.list->error()->text.contains(u"too many elements without content"))
+            << keyOf(kind).toString().toStdString() << file.list->error()->text.toStdString();
+    }
+    // The name of a parcel is a part of each parcel in it.
+    LandXmlFile named(fileOf("<Parcels><Parcel name='" + QByteArray(100000, 'n') + "'><Parcels>" +
+                             QByteArray("<Parcel/>").repeated(1000) + "</Parcels></Parcel></Parcels>"),
+                      queryOf(Kind::Parcels));
+    named.rows();
+    EXPECT_TRUE(named.list->error());
     // What a program writes at the least, many times.
     QByteArray sound;
     for (int i = 0; i < 60000; ++i) {
@@ -179,7 +208,7 @@ TEST(LandXmlHostile, PointsAreNotProjectedOntoCoils)
     EXPECT_EQ(coil.rows(), QStringList());
     EXPECT_TRUE(coil.list->error() && coil.list->error()->text.contains(u"turn too many times"));
     const QByteArray ramp =
-        "<Curve rot='cw' length='2000'><Start>0 0</Start><Center>0 50</Center><End>0.001 0</End></Curve>";
+        "<Curve rot='cw' length='1884.957'><Start>0 0</Start><Center>0 50</Center><End>0.001 0</End></Curve>";
     LandXmlFile turns(fileOf(points + alignment(ramp)), queryOf(Kind::OffsetsOf), {QStringLiteral("Offset")});
     EXPECT_EQ(turns.rows().size(), 20000) << "a ramp of a few turns is not a coil";
 }

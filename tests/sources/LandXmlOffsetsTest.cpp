@@ -66,7 +66,7 @@ TEST(LandXmlOffsets, OfAGroupAndOfAnAlignmentAreListedAlone)
     query.alignment = u"street"_qs;
     LandXmlFile missing(content, query, variables);
     EXPECT_EQ(missing.rows(), QStringList());
-    EXPECT_TRUE(textOfError(missing.list->error()).contains(u"\"street\" is not in the file"));
+    EXPECT_TRUE(textOfError(missing.list->error()).contains(u"the file has no alignment \"street\""));
 
     query.alignment.clear();
     LandXmlFile several(content, query, variables);

@@ -44,15 +44,17 @@ TEST(LandXmlPoints, OfAGroupAreListedAlone)
     const QByteArray content = fileOf("<CgPoints name='a'><CgPoint name='1'>1 1</CgPoint></CgPoints>"
                                       "<CgPoints name='b'><CgPoint name='2'>2 2</CgPoint></CgPoints>");
     EXPECT_EQ(LandXmlFile(content, queryOf(Kind::Points, "b"), {QStringLiteral("Name")}).rows(), QStringList(u"2"_qs));
-    for (const char *wrong : {"c", "A"}) {
+    for (const auto &[wrong, nearest] : {std::pair("c", ""), std::pair("A", "; did you mean \"a\"?")}) {
         LandXmlFile file(content, queryOf(Kind::Points, wrong), {QStringLiteral("Name")});
         EXPECT_EQ(file.rows(), QStringList()) << wrong;
         EXPECT_EQ(textOfError(file.list->error()),
-                  QStringLiteral("\"%1\" is not in the file: one of a, b was expected").arg(QLatin1StringView(wrong)));
+                  QStringLiteral("the file has no group of points \"%1\": one of a, b was expected%2")
+                      .arg(QLatin1StringView(wrong), QLatin1StringView(nearest)));
     }
     LandXmlFile none(fileOf("<CgPoints><CgPoint name='1'>1 1</CgPoint></CgPoints>"), queryOf(Kind::Points, "c"));
     EXPECT_EQ(none.rows(), QStringList());
-    EXPECT_EQ(textOfError(none.list->error()), u"\"c\" is not in the file, which has no names for it"_qs);
+    EXPECT_EQ(textOfError(none.list->error()),
+              u"the file has no group of points \"c\"; there are no names to choose from"_qs);
 }
 
 TEST(LandXmlPoints, AnErrorNamesAFewOfManyGroups)
@@ -63,8 +65,10 @@ TEST(LandXmlPoints, AnErrorNamesAFewOfManyGroups)
     }
     LandXmlFile file(fileOf(groups), queryOf(Kind::Points, "g"));
     EXPECT_EQ(file.rows(), QStringList());
-    EXPECT_EQ(textOfError(file.list->error()),
-              u"\"g\" is not in the file: one of g1, g2, g3, g4, g5, g6, g7, g8, g9, g10, … was expected"_qs);
+    EXPECT_EQ(
+        textOfError(file.list->error()),
+        u"the file has no group of points \"g\": one of g1, g2, g3, g4, g5, g6, g7, g8, g9, g10, … was expected; did you "
+        "mean \"g1\"?"_qs);
 }
 
 TEST(LandXmlPoints, AfterAGroupInAGroupBelongToTheOuterOne)
@@ -98,7 +102,9 @@ TEST(LandXmlPoints, OfSurfacesHaveTheirSurface)
         queryOf(Kind::SurfacePoints), pointVariables);
     EXPECT_EQ(file.rows(0), QStringList({QStringLiteral("1|-|-|-|ground|1|2|3"), QStringLiteral("2|-|-|-|ground|4|5|6"),
                                          QStringLiteral("1|-|-|-|rock|7|8|9")}));
-    EXPECT_EQ(file.notes(), QStringList({QStringLiteral("Faces: 1 in the file, which no list reads"),
+    EXPECT_EQ(file.notes(), QStringList({QStringLiteral("DataPoints: 1 in the file, which no list reads"),
+                                         QStringLiteral("F: 1 in the file, which no list reads"),
+                                         QStringLiteral("Faces: 1 in the file, which no list reads"),
                                          QStringLiteral("SourceData: 1 in the file, which no list reads")}))
         << "points of two surfaces may have one name";
 }

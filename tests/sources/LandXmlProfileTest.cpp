@@ -95,7 +95,7 @@ TEST(LandXmlProfile, APointThatOccursTwiceIsOneAndACurveOfNoLengthIsNotOne)
 TEST(LandXmlProfile, OfOneGradeLineIsListedAlone)
 {
     const QByteArray content = fileOf(alignment(
-        bend(), "name='road'", {},
+        bend(), "name='road' staStart='0'", {},
         "<Profile><ProfAlign name='left'><PVI>0 1</PVI><PVI>150 2</PVI></ProfAlign><ProfAlign name='right'><PVI>0 3"
         "</PVI><PVI>150 4</PVI></ProfAlign></Profile>"));
     LandXmlQuery query = queryOf(Kind::Profile);
@@ -105,7 +105,9 @@ TEST(LandXmlProfile, OfOneGradeLineIsListedAlone)
     query.gradeLine = u"middle"_qs;
     LandXmlFile missing(content, query);
     EXPECT_EQ(missing.rows(), QStringList());
-    EXPECT_EQ(textOfError(missing.list->error()), u"\"middle\" is not in the file: one of left, right was expected"_qs);
+    EXPECT_EQ(
+        textOfError(missing.list->error()),
+        u"the file has no grade line \"middle\" in the alignments that are listed: one of left, right was expected"_qs);
 }
 
 TEST(LandXmlProfile, StationsAreNamedByTheEquations)

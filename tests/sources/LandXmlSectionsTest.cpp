@@ -88,7 +88,8 @@ TEST(LandXmlSections, OfASurfaceThatIsNotThereAreAnError)
                                   "</CrossSectSurf></CrossSect>"),
                      query);
     EXPECT_EQ(file.rows(), QStringList());
-    EXPECT_EQ(textOfError(file.list->error()), u"\"rock\" is not in the file: one of ground was expected"_qs);
+    EXPECT_EQ(textOfError(file.list->error()),
+              u"the file has no surface \"rock\" for this list: one of ground was expected"_qs);
 }
 
 TEST(LandXmlSections, WithoutAStationAreErrors)

@@ -120,7 +120,7 @@ TEST(LandXmlStations, ThatAreListedAreWhereverTheirNumberIs)
 
 TEST(LandXmlStations, HaveHeightsOfTheGradeLineAndTheSurface)
 {
-    const QByteArray content = fileOf(alignment(straight, "name='road'", {}, profile));
+    const QByteArray content = fileOf(alignment(straight, "name='road' staStart='0'", {}, profile));
     LandXmlQuery query = everyTenth();
     const QStringList variables = {QStringLiteral("Design"), QStringLiteral("Grade"), QStringLiteral("Ground"),
                                    QStringLiteral("CutFill")};
@@ -132,15 +132,18 @@ TEST(LandXmlStations, HaveHeightsOfTheGradeLineAndTheSurface)
     query.surface = u"rock"_qs;
     LandXmlFile rock(content, query, variables);
     EXPECT_EQ(rock.rows(), QStringList());
-    EXPECT_EQ(textOfError(rock.list->error()), u"\"rock\" is not in the file: one of ground was expected"_qs);
+    EXPECT_EQ(textOfError(rock.list->error()),
+              u"the file has no surface \"rock\" for this list: one of ground was expected"_qs);
     query.surface.clear();
     query.gradeLine = u"old"_qs;
     LandXmlFile old(content, query, variables);
     EXPECT_EQ(old.rows(), QStringList());
-    EXPECT_EQ(textOfError(old.list->error()), u"\"old\" is not in the file: one of design, other was expected"_qs);
+    EXPECT_EQ(
+        textOfError(old.list->error()),
+        u"the file has no grade line \"old\" in the alignments that are listed: one of design, other was expected"_qs);
     LandXmlFile lane(content, queryOf(Kind::Stations, "lane"), variables);
     EXPECT_EQ(lane.rows(), QStringList());
-    EXPECT_EQ(textOfError(lane.list->error()), u"\"lane\" is not in the file: one of road was expected"_qs);
+    EXPECT_EQ(textOfError(lane.list->error()), u"the file has no alignment \"lane\": one of road was expected"_qs);
 }
 
 TEST(LandXmlStations, MayBeAskedForInTheUnitOfTheFile)
@@ -163,7 +166,7 @@ TEST(LandXmlStations, HavePointsBesideThem)
 {
     LandXmlQuery query = queryOf(Kind::Stations);
     query.offsets = {{-5, -2.5}, {7, std::nullopt}};
-    LandXmlFile file(fileOf(alignment(straight, "name='road'", {}, profile)), query,
+    LandXmlFile file(fileOf(alignment(straight, "name='road' staStart='0'", {}, profile)), query,
                      {QStringLiteral("Offset1"), QStringLiteral("Northing1"), QStringLiteral("Easting1"),
                       QStringLiteral("Elevation1"), QStringLiteral("Offset2"), QStringLiteral("Easting2"),
                       QStringLiteral("Elevation2")});
@@ -175,7 +178,7 @@ TEST(LandXmlStations, HavePointsBesideThem)
 TEST(LandXmlStations, AreSortedAndGoneBackTo)
 {
     LandXmlQuery query = everyTenth();
-    LandXmlFile file(fileOf(alignment(straight, "name='road'", {}, profile)), query,
+    LandXmlFile file(fileOf(alignment(straight, "name='road' staStart='0'", {}, profile)), query,
                      {QStringLiteral("Station"), QStringLiteral("Ground")});
     EXPECT_EQ(file.row(4, 0), u"100|11"_qs);
     EXPECT_EQ(file.row(0, 0), u"0|11"_qs);
@@ -198,16 +201,16 @@ TEST(LandXmlStations, EquationsThatDoNotFitAreErrors)
     };
     for (const Row &row : rows) {
         for (const Kind kind : {Kind::Stations, Kind::Elements, Kind::Alignments}) {
-            LandXmlFile file(fileOf(alignment(straight, "name='road'", row.equations)), queryOf(kind));
+            LandXmlFile file(fileOf(alignment(straight, "name='road' staStart='0'", row.equations)), queryOf(kind));
             EXPECT_EQ(file.rows(), QStringList()) << row.reason;
             ASSERT_TRUE(file.list->error()) << row.reason;
             EXPECT_EQ(placeText(file.list->error()), u"5:1"_qs) << row.reason;
             EXPECT_TRUE(file.list->error()->text.contains(u"station equation")) << row.reason;
         }
     }
-    LandXmlFile differs(
-        fileOf(alignment(straight, "name='road'", "<StaEquation staInternal='50' staBack='51' staAhead='1'/>")),
-        queryOf(Kind::Stations));
+    LandXmlFile differs(fileOf(alignment(straight, "name='road' staStart='0'",
+                                         "<StaEquation staInternal='50' staBack='51' staAhead='1'/>")),
+                        queryOf(Kind::Stations));
     differs.rows();
     EXPECT_EQ(differs.notes().size(), 1);
     EXPECT_TRUE(differs.notes().value(0).contains(u"staBack is 51.0000 in the file, but 50.0000 by its geometry"));
@@ -227,6 +230,7 @@ TEST(LandXmlStations, AnAlignmentWithoutElementsHasNone)
     LandXmlFile file(fileOf("<Alignments><Alignment name='x'/></Alignments>"), everyTenth());
     EXPECT_EQ(file.rows(), QStringList());
     EXPECT_FALSE(file.list->error());
+    EXPECT_TRUE(file.notes().contains(u"4:13: the alignment has no elements, and therefore no stations"_qs));
 }
 
 TEST(LandXmlStations, AnEquationKeepsItsNamesBesideABorder)
@@ -243,7 +247,7 @@ TEST(LandXmlStations, AnEquationKeepsItsNamesBesideABorder)
         LandXmlQuery query = everyTenth();
         query.stations = {50.00001};
         LandXmlFile file(
-            fileOf(alignment(elements, "name='road'",
+            fileOf(alignment(elements, "name='road' staStart='0'",
                              QByteArray("<StaEquation staInternal='") + row.internal + "' staAhead='500'/>")),
             query,
             {QStringLiteral("Station"), QStringLiteral("StationBack"), QStringLiteral("Region"),
@@ -252,7 +256,7 @@ TEST(LandXmlStations, AnEquationKeepsItsNamesBesideABorder)
         EXPECT_EQ(rows.value(2), QString::fromLatin1(row.row));
         EXPECT_EQ(rows.size(), 5) << "0, 25, 50, 75 and 100 in all";
     }
-    LandXmlFile two(fileOf(alignment(straight, "name='road'",
+    LandXmlFile two(fileOf(alignment(straight, "name='road' staStart='0'",
                                      "<StaEquation staInternal='50' staAhead='500'/>"
                                      "<StaEquation staInternal='50.00005' staAhead='900'/>")),
                     queryOf(Kind::Stations), {QStringLiteral("Station")});
@@ -341,8 +345,8 @@ TEST(LandXmlStations, OfAnAlignmentAreListedWhateverIsWrongWithOthers)
 TEST(LandXmlStations, TheGroundHasGapsBetweenItsPieces)
 {
     const auto ground = [](const QByteArray &lists) {
-        return fileOf(
-            alignment(straight, "name='road'", {}, "\n<Profile><ProfSurf name='g'>" + lists + "</ProfSurf></Profile>"));
+        return fileOf(alignment(straight, "name='road' staStart='0'", {},
+                                "\n<Profile><ProfSurf name='g'>" + lists + "</ProfSurf></Profile>"));
     };
     LandXmlQuery query = queryOf(Kind::Stations);
     query.interval = 20;

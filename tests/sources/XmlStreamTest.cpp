@@ -28,13 +28,21 @@ public:
         if (name == "skip") {
             return Interest::None;
         }
+        if (name == "left") {
+            return Interest::LeftOut;
+        }
         return name == "parts" ? Interest::Parts : Interest::Text;
     }
     void endElement() override { heard += "</>"; }
     void text(std::string_view piece) override { heard += piece; }
     void foreignElement(std::string_view name) override { heard += '{' + std::string(name) + '}'; }
+    void leftOutElements(std::string_view name, std::size_t count) override
+    {
+        leftOut += std::string(name) + ' ' + std::to_string(count) + ' ';
+    }
 
     std::string heard;
+    std::string leftOut;
 };
 
 /// A file that has been read to its end.
@@ -231,6 +239,16 @@ TEST(XmlStream, APrefixIsFoundAmongMany)
     const Read read(content);
     EXPECT_FALSE(read.error);
     EXPECT_EQ(read.listener.heard, "<a>" + QByteArray("<b></>{p7:c}").repeated(1000).toStdString() + "</>");
+}
+
+TEST(XmlStream, ElementsInOneThatIsLeftOutAreToldByTheirNames)
+{
+    const Read read(
+        "<p:r xmlns:p='urn:p' xmlns:q='urn:q'><p:left><p:a>x<p:b/><p:b/></p:a><q:c/></p:left><p:skip><p:d/></p:skip>"
+        "<q:other><q:e/><p:f/></q:other><p:parts/></p:r>");
+    EXPECT_EQ(read.listener.leftOut, "a 1 b 2 c 1 q:e 1 p:f 1 ");
+    EXPECT_EQ(read.listener.heard, "<r><left><skip>{q:other}<parts></></>");
+    EXPECT_FALSE(read.error);
 }
 
 } // namespace
