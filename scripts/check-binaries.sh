@@ -3,7 +3,9 @@
 # protections that the build was to put in and did not. Prints one line for each; exit status 1 when there is one.
 #
 #   scripts/check-binaries.sh [--paths-only | --outside] FILE...
+#   scripts/check-binaries.sh --in FOLDER
 #
+# --in looks at every program and library in a folder and those below it.
 # --paths-only looks at the search paths alone, as for tests, which are built without the protections.
 # --outside does so too, and lets them lead into absolute folders, as those of a program do that is not installed.
 set -euo pipefail
@@ -14,7 +16,18 @@ case "${1:-}" in
 --paths-only) paths_only=1; shift ;;
 --outside) paths_only=1; outside=1; shift ;;
 esac
-[ $# -gt 0 ] || { echo "usage: check-binaries.sh [--paths-only | --outside] FILE..." >&2; exit 1; }
+[ $# -gt 0 ] || { echo "usage: check-binaries.sh [--paths-only | --outside] FILE... | --in FOLDER" >&2; exit 1; }
+if [ "$1" = --in ]; then
+    # Not object files, nor what CMake builds to look at the compiler.
+    mapfile -d '' candidates < <(find "$2" -type f ! -name '*.o' ! -path '*/CMakeFiles/*' -print0 | sort -z)
+    set --
+    for file in "${candidates[@]}"; do
+        if [ "$(head -c 4 "$file" | od -An -c | tr -d ' ')" = '177ELF' ]; then
+            set -- "$@" "$file"
+        fi
+    done
+    [ $# -gt 0 ] || { echo "no program or library was found"; exit 1; }
+fi
 
 failed=0
 wrong() { # file, what is wrong

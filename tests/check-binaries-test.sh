@@ -81,6 +81,27 @@ expect '_FORTIFY_SOURCE: printf' -- -U_FORTIFY_SOURCE -fno-builtin
 expect '' --paths-only -- -no-pie -fno-pie -fno-stack-protector -Wl,-z,lazy
 [ "$(uname -m)" != x86_64 ] || expect 'no endbr64' -- -fcf-protection=none
 
+# Of a folder, all that can be run or loaded is looked at, wherever it is, and nothing else.
+mkdir -p "$folder/tree/bin" "$folder/tree/lib/more"
+compile
+mkdir -p "$folder/tree/CMakeFiles"
+cp "$object" "$folder/main.cpp" "$folder/tree/bin"
+"$compiler" "${good[@]}" -Wl,-rpath,. -o "$folder/tree/CMakeFiles/a.out" "$object"
+in_folder() { # what is said of the folder in each line, and in how many
+    local output
+    output=$(scripts/check-binaries.sh --in "$folder/tree" || true)
+    if [ "$(grep -c . <<< "$output")" != "$2" ] || [ "$(grep -cF -- "$1" <<< "$output")" -lt "$2" ]; then
+        printf 'of the folder, "%s" was expected %d times, this was said: %s\n' "$1" "$2" "$output"
+        failed=1
+    fi
+}
+in_folder 'no program or library was found' 1
+"$compiler" "${good[@]}" -o "$folder/tree/bin/program" "$object"
+in_folder '' 0
+"$compiler" "${good[@]}" -Wl,-rpath,. -o "$folder/tree/lib/more/library.so.1" "$object"
+"$compiler" "${good[@]}" -Wl,-rpath,. -o "$folder/tree/bin/other" "$object"
+in_folder 'the element "."' 2
+
 if scripts/check-binaries.sh "$folder/main.cpp" > "$folder/said" || ! grep -q 'cannot be read' "$folder/said"; then
     echo 'what is no program was taken for one'
     failed=1
