@@ -3,13 +3,17 @@
 #include "PageHeader.h"
 #include "Pages.h"
 #include "ReportContent.h"
+#include "ReportEdit.h"
 #include "ReportTextDecoder.h"
 #include "RichTextReader.h"
 #include "UReportDoc.h"
+#include "UReportView.h"
 #include "World.h"
 
+#include <QApplication>
 #include <QFile>
 #include <QFileInfo>
+#include <QTest>
 #include <QTextDocument>
 
 #include <algorithm>
@@ -177,6 +181,9 @@ void World::reopen(Chance &chance)
     const bool isCopied = QFile::copy(report.GetPathName(), copy);
     limitFiles(limit);
     wrong_ = isCopied ? openSaved(report, copy, byCommand) : QStringLiteral("it is not there");
+    if (wrong_.isEmpty() && ending == u"rtf") {
+        wrong_ = editOpened(copy, chance);
+    }
     if (!wrong_.isEmpty()) {
         wrong_.prepend(did + QStringLiteral(" opened again: "));
     }
@@ -214,6 +221,37 @@ QString World::openSaved(const UReportDoc &report, const QString &copy, bool byC
                        (!isRichText && (*opened)->GetPageStarts() != starts)))
     {
         return QStringLiteral("other pages, %1 and not %2").arg(openedPages.size()).arg(pages.size());
+    }
+    return {};
+}
+
+QString World::editOpened(const QString &copy, Chance &chance)
+{
+    UReportView *view = viewWithKeyboard();
+    if (view == nullptr || view->GetDocument() == nullptr || view->GetDocument()->GetPathName() != copy ||
+        !isRich(*view->GetDocument()))
+    {
+        return {};
+    }
+    const UReportDoc &report = *view->GetDocument();
+    QPlainTextEdit &edit = view->GetEdit();
+    QTextCursor cursor = edit.textCursor();
+    cursor.setPosition(static_cast<int>(chance.below(edit.document()->characterCount())));
+    edit.setTextCursor(cursor);
+    const QString before = view->GetEdit().windowText();
+    // In the text every line end before the cursor is one character more.
+    const QString typed = QString(before).insert(cursor.position() + cursor.blockNumber(), u'y');
+    QTest::keyClick(QApplication::focusWidget(), Qt::Key_Y);
+    did += QStringLiteral(", typed at %1").arg(cursor.position());
+    if (textOf(report) != typed || report.GetPageStarts() != kareport::pageHeadersIn(typed) || !report.IsModified()) {
+        return QStringLiteral("what was typed gives another text, or other pages: ") + textOf(report).left(500);
+    }
+    if (chance.oneIn(2)) {
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Z, Qt::ControlModifier);
+        did += QStringLiteral(" and undone");
+        if (textOf(report) != before) {
+            return QStringLiteral("what was undone gives another text: ") + textOf(report).left(500);
+        }
     }
     return {};
 }

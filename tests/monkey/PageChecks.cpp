@@ -242,10 +242,12 @@ bool World::isNew(const QByteArray &making)
 
 QString World::checkPages()
 {
-    constexpr quint64 interval = 56; // steps: a long one takes its time, and printing would end its loading
-    const auto isLookedAt = [this](const UReportDoc &report) {
-        constexpr qint64 longText = 200'000;
-        return !report.IsEmpty() && (report.GetTextLength() < longText || steps_ % interval == 0);
+    // What takes its time, or changes what happens: printing ends a load in pieces.
+    constexpr quint64 interval = 56; // steps
+    const bool isTurn = steps_ % interval == 0;
+    const auto isLookedAt = [isTurn](const UReportDoc &report) {
+        constexpr qint64 longText = 2'000'000;
+        return !report.IsEmpty() && (report.GetTextLength() < longText || isTurn);
     };
     for (const UReportDoc *report : reports()) {
         if (isLookedAt(*report) && isNew("PDF" + makingOf(*report))) {
@@ -259,7 +261,8 @@ QString World::checkPages()
         // Formats are the view's own.
         const bool hasFormats = view->ShowsFormats() || isRich(report);
         const QByteArray formats = hasFormats ? view->GetEdit().document()->toHtml().toUtf8() : QByteArray();
-        if (isLookedAt(report) && isNew("print" + makingOf(report) + formats)) {
+        const bool isWhole = !view->GetEdit().isLoading() || isTurn;
+        if (isWhole && isLookedAt(report) && isNew("print" + makingOf(report) + formats)) {
             if (const QString wrong = checkPrint(*view); !wrong.isEmpty()) {
                 return QStringLiteral("\"%1\" printed: ").arg(report.GetTitle()) + wrong;
             }

@@ -125,6 +125,8 @@ private:
     std::vector<UReportDoc *> savedReports() const;
     /// Opens a file that a report was saved in, or a copy of it. @return what is wrong with what is opened; empty when nothing is
     QString openSaved(const UReportDoc &report, const QString &copy, bool byCommand);
+    /// Types into rich text that was opened, and may undo that. @return what is wrong afterwards; empty when nothing is
+    QString editOpened(const QString &copy, Chance &chance);
     static QString checkPdf(const UReportDoc &report);
     /// All that the PDF and the print of a report are made of.
     static QByteArray makingOf(const UReportDoc &report);
