@@ -18,15 +18,23 @@ namespace
 
 constexpr qint64 blockSize = 1 << 16;
 
-/// A complete PDF ends with this.
+/// Whether a PDF was written whole: what writes it does not look at the disk's answers. It ends with a mark, and before that
+/// says where its table is: with a piece missing before the table, that is elsewhere.
 bool isWhole(QFile &pdf)
 {
-    const QByteArray mark("%%EOF");
-    constexpr qint64 tail = 16;
+    constexpr qint64 tail = 64;
+    const QByteArray pointer("startxref");
     pdf.seek(std::max<qint64>(0, pdf.size() - tail));
-    const bool whole = pdf.readAll().contains(mark);
+    const QByteArray end = pdf.readAll();
+    const qsizetype at = end.lastIndexOf(pointer);
+    const qsizetype mark = end.lastIndexOf("%%EOF");
+    bool isWhole = false;
+    if (at >= 0 && mark > at) {
+        const QByteArray place = end.sliced(at + pointer.size(), mark - at - pointer.size()).trimmed();
+        isWhole = pdf.seek(place.toLongLong()) && pdf.read(4) == "xref";
+    }
     pdf.seek(0);
-    return whole;
+    return isWhole;
 }
 
 /// A preview keeps its pages as pictures, whatever the printer is set to.
