@@ -83,13 +83,8 @@ bool UReportDoc::OnNewDocument()
 bool UReportDoc::OnOpenDocument(const QString &path)
 {
     parts_->openedFromRtf = namesRichText(path);
-    parts_->openedWithoutMemory = false;
-    bool isOpened = false;
-    const bool isTried = kareport::doneWhileMemoryLasts([&] { isOpened = UDocument::OnOpenDocument(path); });
-    if (!isTried && IsReportAvailable(this)) {
-        parts_->openedWithoutMemory = true;
-    }
-    if (!isOpened) {
+    parts_->openedWithoutMemory = true; // until it comes to reading the file
+    if (!UDocument::OnOpenDocument(path)) {
         return false;
     }
     SetPageSize();
@@ -108,6 +103,7 @@ void UReportDoc::Serialize(UArchive &archive)
         }
         return;
     }
+    parts_->openedWithoutMemory = false;
     if (!GetViews().empty() && archive.GetLength() > UView::nMaxSize) {
         AppMessageBox(kareport::fileTooLarge, 0, unsigned(-1));
         archive.Abandon();

@@ -105,6 +105,7 @@ bool saveUnderChosenName(UReportDoc &report, const QString &path, bool replace)
     if (!UReportDoc::IsReportAvailable(&report)) {
         return false; // it was closed while the dialog was open
     }
+    const bool wasModified = report.IsModified();
     bool isSaved = false;
     {
         const kareport::WaitCursor cursor;
@@ -119,6 +120,12 @@ bool saveUnderChosenName(UReportDoc &report, const QString &path, bool replace)
     if (isThere) {
         if (replace) {
             report.SetPathName(name, !kareport::isRichTextName(name) && !kareport::isPdfName(name));
+        }
+        if (replace && report.GetPathName() != name) {
+            // There was no memory for it: what is saved later would go to another file.
+            report.SetModifiedFlag(wasModified);
+            kareport::sayNotSaved(name, kareport::noMemoryText());
+            return false;
         }
         report.SetModifiedFlag(false);
     }

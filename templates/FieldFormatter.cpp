@@ -217,7 +217,10 @@ void FieldFormatter::appendNumber(TextBuffer &out, double value, int decimals) c
 
 void FieldFormatter::appendBearing(TextBuffer &out, const UJobSettings &settings, double value) const
 {
+    // What memory it takes is asked for here: the conversion answers with an empty text where there is none.
+    constexpr qsizetype longestBearing = 64;
     QString text;
+    text.reserve(longestBearing);
     UFormatBearing(settings.bearingUnit, settings.bearingStyle, settings.bearingDecimals, settings.bearingPadding,
                    settings.bearingReference)
         .ConvertToDisplayString(value, text);

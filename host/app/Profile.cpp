@@ -1,5 +1,7 @@
 #include "Profile.h"
 
+#include "MemoryLasts.h"
+
 #include <QHashFunctions>
 #include <QSettings>
 
@@ -108,5 +110,5 @@ QString GetProfileString(const QString &section, const QString &entry, const QSt
 
 void WriteProfileString(const QString &section, const QString &entry, const QString &value)
 {
-    kareport::profileStore().write(section, entry, value);
+    kareport::doneWhileMemoryLasts([&] { kareport::profileStore().write(section, entry, value); });
 }

@@ -7,10 +7,10 @@
 #include <memory>
 
 /// The application's profile entry of a name in a section ("" is the application's own), or `fallback` when there is
-/// none.
+/// none. Throws std::bad_alloc without memory: the fallback would pass for what the user has set.
 KAREPORT_EXPORT QString GetProfileString(const QString &section, const QString &entry,
                                          const QString &fallback = QString());
-/// Stores a profile entry.
+/// Stores a profile entry; without memory, an earlier one stays.
 KAREPORT_EXPORT void WriteProfileString(const QString &section, const QString &entry, const QString &value);
 
 namespace kareport

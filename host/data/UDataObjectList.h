@@ -25,7 +25,7 @@ public:
     /// their order.
     virtual void Sort(const std::vector<unsigned> &ids);
 
-    /// Adds an empty object at the end.
+    /// Adds an empty object at the end. Throws std::bad_alloc without memory, with the list as it was.
     UDataObject &Add();
 
 private:

@@ -12,9 +12,10 @@ public:
     /// The entry of an identifier, or null. The pointer is valid until the dictionary is changed.
     const UDictEntry *Find(unsigned id) const;
 
-    /// Stores a value under an identifier, replacing an earlier one.
+    /// Stores a value under an identifier, replacing an earlier one. Throws std::bad_alloc without memory, with the values
+    /// as they were: one that is missing would show as blanks or as 0.
     void Set(unsigned id, UDictEntry::Value value);
-    /// The value under an identifier for refilling in place; a new entry holds an empty `T`.
+    /// The value under an identifier for refilling in place; a new entry holds an empty `T`. Throws like `Set`.
     template <typename T>
     T &Refill(unsigned id)
     {

@@ -43,9 +43,10 @@ QDockWidget *COneViewPane::GetDock() const
 
 void COneViewPane::AddView(std::unique_ptr<UView> view)
 {
+    const UView *added = view.get();
     QWidget *widget = view->GetWidget();
     CViewPane::AddView(std::move(view));
-    if (widget != nullptr && dock_) {
+    if (GetActiveView() == added && widget != nullptr && dock_) {
         dock_->setWidget(widget);
         dock_->setFocusProxy(widget);
     }

@@ -1,5 +1,6 @@
 #include "CViewPane.h"
 
+#include "MemoryLasts.h"
 #include "UDocument.h"
 #include "UView.h"
 
@@ -46,7 +47,7 @@ void CViewPane::RemoveView(UView *view)
 void CViewPane::AddView(std::unique_ptr<UView> view)
 {
     view->pane_ = this;
-    views_.push_back(std::move(view));
+    kareport::doneWhileMemoryLasts([&] { views_.push_back(std::move(view)); });
 }
 
 UDocument *CViewPane::GetActiveDocument() const
@@ -57,7 +58,7 @@ UDocument *CViewPane::GetActiveDocument() const
 void CViewPane::SetWindowTextW(const QString &text)
 {
     text_ = text;
-    UpdateTitle();
+    kareport::doneWhileMemoryLasts([this] { UpdateTitle(); });
 }
 
 QString CViewPane::GetCaption() const

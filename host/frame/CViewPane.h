@@ -27,7 +27,7 @@ public:
     CViewPane(const CViewPane &) = delete;
     CViewPane &operator=(const CViewPane &) = delete;
 
-    /// Takes a view into the pane, which owns it from then on.
+    /// Takes a view into the pane, which owns it from then on. Without memory the view is destroyed.
     virtual void AddView(std::unique_ptr<UView> view);
     /// The views, in the order in which they were added.
     const std::vector<std::unique_ptr<UView>> &GetViews() const { return views_; }
@@ -84,6 +84,7 @@ public:
     /// Whether a pointer is a pane that is open.
     static bool IsOpen(const CViewPane *pane);
     /// The captions of all open panes that have a document's title, in the order in which they were opened.
+    /// Throws std::bad_alloc without memory: a title would be taken for one that no other pane has.
     /// @param except  a document whose panes do not count; null for none
     static void GetPaneCaptions(QStringList &captions, const UDocument *except = nullptr);
 

@@ -1,5 +1,7 @@
 #include "UApplication.h"
 
+#include "MemoryLasts.h"
+
 #include <algorithm>
 #include <utility>
 
@@ -36,7 +38,8 @@ UApplication *UApplication::Get()
 
 UDocTemplate *UApplication::AddDocTemplate(std::unique_ptr<UDocTemplate> docTemplate)
 {
-    return templates_.emplace_back(std::move(docTemplate)).get();
+    return kareport::whileMemoryLasts<UDocTemplate *>(
+        nullptr, [&] { return templates_.emplace_back(std::move(docTemplate)).get(); });
 }
 
 std::vector<UDocument *> UApplication::GetDocuments() const
@@ -68,14 +71,16 @@ void UApplication::CloseAllDocuments()
 void UApplication::AddToRecentFileList(const QString &path)
 {
     // Made again, so that the list stays as it is when memory ends.
-    QStringList files;
-    files.append(path);
-    for (const QString &file : std::as_const(recentFiles_)) {
-        if (file != path && files.size() < mostRecentFiles) {
-            files.append(file);
+    kareport::doneWhileMemoryLasts([&] {
+        QStringList files;
+        files.append(path);
+        for (const QString &file : std::as_const(recentFiles_)) {
+            if (file != path && files.size() < mostRecentFiles) {
+                files.append(file);
+            }
         }
-    }
-    recentFiles_ = std::move(files);
+        recentFiles_ = std::move(files);
+    });
 }
 
 void UApplication::OnDocumentEvent(UDocument & /*document*/, UDocument::DocumentEvent /*event*/) {}

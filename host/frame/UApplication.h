@@ -21,19 +21,20 @@ public:
     /// The application, or null when there is none.
     static UApplication *Get();
 
-    /// Takes a template over. @return the template
+    /// Takes a template over. @return the template; null, with the template destroyed, when memory ends
     UDocTemplate *AddDocTemplate(std::unique_ptr<UDocTemplate> docTemplate);
     /// In the order in which they were added.
     const std::vector<std::unique_ptr<UDocTemplate>> &GetDocTemplates() const { return templates_; }
 
-    /// The documents of all templates, those of a template together, in the order in which they were made.
+    /// The documents of all templates, those of a template together, in the order in which they were made. Throws
+    /// std::bad_alloc without memory: who closes them must not pass over one.
     std::vector<UDocument *> GetDocuments() const;
     /// Whether a pointer is an open document; it may be stale.
     bool IsOpen(const void *document) const;
     /// Closes the documents of all templates and their panes without asking.
     void CloseAllDocuments();
 
-    /// Puts a file to the front of the list of files last used.
+    /// Puts a file to the front of the list of files last used, which stays as it is when memory ends.
     virtual void AddToRecentFileList(const QString &path);
     /// The files last used, the last one first; at most ten.
     const QStringList &GetRecentFileList() const { return recentFiles_; }

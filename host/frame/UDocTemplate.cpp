@@ -2,6 +2,7 @@
 
 #include "AutoDeleteGuard.h"
 #include "CViewPane.h"
+#include "MemoryLasts.h"
 #include "UDocument.h"
 #include "UView.h"
 
@@ -26,6 +27,19 @@ struct CloseUnfinishedPane
 };
 using UnfinishedPane = std::unique_ptr<CViewPane, CloseUnfinishedPane>;
 
+void updateFirst(CViewPane &pane, UDocument &document, bool makeVisible)
+{
+    for (const auto &view : pane.GetViews()) {
+        if (view->GetDocument() == &document) {
+            view->OnInitialUpdate();
+        }
+    }
+    if (makeVisible) {
+        pane.ShowPane(true);
+    }
+    document.UpdateFrameCounts();
+}
+
 } // namespace
 
 /// A document that is being made: it is destroyed, with its views, if that fails.
@@ -44,6 +58,13 @@ struct UDocTemplate::UnfinishedDocument
     }
     UnfinishedDocument(const UnfinishedDocument &) = delete;
     UnfinishedDocument &operator=(const UnfinishedDocument &) = delete;
+
+    // Like the template's functions of these names, but that they throw when memory ends: without a pane of its own, a
+    // document would be made that nobody sees.
+    static UDocument *open(UDocTemplate &docTemplate, const QString &path, bool makeVisible, CViewPane *pane,
+                           unsigned style, const QRect *rect);
+    static CViewPane *createPane(UDocTemplate &docTemplate, UDocument *document, CViewPane *parent, unsigned style,
+                                 const QRect *rect);
 };
 
 UDocTemplate::UDocTemplate(unsigned resourceId, DocumentFactory makeDocument, PaneFactory makePane,
@@ -77,13 +98,20 @@ void UDocTemplate::CloseAllDocuments()
 UDocument *UDocTemplate::OpenReportDocumentFile(const QString &path, int /*addToFrame*/, int makeVisible,
                                                 CViewPane *pane, unsigned style, const QRect *rect)
 {
-    std::unique_ptr<UDocument> made = makeDocument_();
+    return kareport::whileMemoryLasts<UDocument *>(
+        nullptr, [&] { return UnfinishedDocument::open(*this, path, makeVisible != 0, pane, style, rect); });
+}
+
+UDocument *UDocTemplate::UnfinishedDocument::open(UDocTemplate &docTemplate, const QString &path, bool makeVisible,
+                                                  CViewPane *pane, unsigned style, const QRect *rect)
+{
+    std::unique_ptr<UDocument> made = docTemplate.makeDocument_();
     if (!made) {
         return nullptr;
     }
     UDocument *document = made.get();
-    document->docTemplate_ = this;
-    documents_.push_back(document);
+    docTemplate.documents_.push_back(document);
+    document->docTemplate_ = &docTemplate;
     UnfinishedDocument unfinished(made.release(), pane);
     // While it is being filled, the document must not be destroyed with a pane that closes.
     const bool autoDelete = document->IsAutoDelete();
@@ -91,10 +119,10 @@ UDocument *UDocTemplate::OpenReportDocumentFile(const QString &path, int /*addTo
 
     UnfinishedPane ownPane(nullptr, {document});
     if (pane == nullptr) {
-        pane = CreateNewPane(document, nullptr, style, rect);
+        pane = createPane(docTemplate, document, nullptr, style, rect);
         ownPane.reset(pane);
     } else {
-        ShowIn(pane, document);
+        docTemplate.ShowIn(pane, document);
     }
     if (path.isEmpty() ? !document->OnNewDocument() : !document->OnOpenDocument(path)) {
         return nullptr;
@@ -106,7 +134,7 @@ UDocument *UDocTemplate::OpenReportDocumentFile(const QString &path, int /*addTo
         }
     }
     if (CViewPane::IsOpen(pane)) {
-        InitialUpdatePane(pane, document, makeVisible);
+        updateFirst(*pane, *document, makeVisible);
     }
     static_cast<void>(ownPane.release()); // it owns itself now
     unfinished.document = nullptr;
@@ -116,13 +144,20 @@ UDocument *UDocTemplate::OpenReportDocumentFile(const QString &path, int /*addTo
 
 CViewPane *UDocTemplate::CreateNewPane(UDocument *document, CViewPane *parent, unsigned style, const QRect *rect)
 {
-    if (!makePane_ || !makeView_) {
+    return kareport::whileMemoryLasts<CViewPane *>(
+        nullptr, [&] { return UnfinishedDocument::createPane(*this, document, parent, style, rect); });
+}
+
+CViewPane *UDocTemplate::UnfinishedDocument::createPane(UDocTemplate &docTemplate, UDocument *document,
+                                                        CViewPane *parent, unsigned style, const QRect *rect)
+{
+    if (!docTemplate.makePane_ || !docTemplate.makeView_) {
         return nullptr;
     }
-    UnfinishedPane pane(makePane_(), {document});
+    UnfinishedPane pane(docTemplate.makePane_(), {document});
     if (pane) {
         pane->SetPlace(parent, style, rect);
-        ShowIn(pane.get(), document);
+        docTemplate.ShowIn(pane.get(), document);
         // Not through the document's own SetTitle, which a report takes for a new title.
         pane->SetWindowTextW(static_cast<const UDocument *>(document)->GetTitle());
     }
@@ -135,26 +170,20 @@ void UDocTemplate::ShowIn(CViewPane *pane, UDocument *document)
     if (view) {
         UView *shown = view.get();
         pane->AddView(std::move(view));
-        try {
-            document->AddView(shown);
-        } catch (const std::bad_alloc &) {
+        if (pane->GetActiveView() != shown) {
+            throw std::bad_alloc(); // the pane had no memory for it
+        }
+        document->AddView(shown);
+        if (shown->GetDocument() != document) {
             pane->RemoveView(shown); // a view without a document would stay in a pane that is given
-            throw;
+            throw std::bad_alloc();
         }
     }
 }
 
 void UDocTemplate::InitialUpdatePane(CViewPane *pane, UDocument *document, int makeVisible)
 {
-    for (const auto &view : pane->GetViews()) {
-        if (view->GetDocument() == document) {
-            view->OnInitialUpdate();
-        }
-    }
-    if (makeVisible != 0) {
-        pane->ShowPane(true);
-    }
-    document->UpdateFrameCounts();
+    kareport::doneWhileMemoryLasts([&] { updateFirst(*pane, *document, makeVisible != 0); });
 }
 
 void UDocTemplate::Forget(UDocument *document)

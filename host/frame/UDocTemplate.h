@@ -48,11 +48,12 @@ public:
     /// @return the document, or null when it cannot be made or loaded
     UDocument *OpenReportDocumentFile(const QString &path, int addToFrame, int makeVisible, CViewPane *pane,
                                       unsigned style, const QRect *rect);
-    /// Makes a pane with a view of a document; null in a program without windows.
+    /// Makes a pane with a view of a document; null in a program without windows, and without memory.
     CViewPane *CreateNewPane(UDocument *document, CViewPane *parent, unsigned style, const QRect *rect);
     /// Closes the template's documents and their panes without asking.
     void CloseAllDocuments();
-    /// Lets the views of a pane show their document for the first time, and shows the pane if wanted.
+    /// Lets the views of a pane show their document for the first time, and shows the pane if wanted. Without memory for
+    /// the first, the pane is not shown.
     void InitialUpdatePane(CViewPane *pane, UDocument *document, int makeVisible);
 
 private:

@@ -8,8 +8,20 @@
 #include "UView.h"
 
 #include <QFileInfo>
+#include <QVarLengthArray>
 
 #include <algorithm>
+
+namespace
+{
+
+/// Without memory the pane goes on to show the title before.
+void showTitle(CViewPane &pane)
+{
+    kareport::doneWhileMemoryLasts([&pane] { pane.UpdateTitle(); });
+}
+
+} // namespace
 
 UDocument::UDocument() = default;
 
@@ -51,7 +63,9 @@ void UDocument::SetPathName(const QString &path, bool addToRecentFiles)
 
 void UDocument::AddView(UView *view)
 {
-    views_.push_back(view);
+    if (!kareport::doneWhileMemoryLasts([this, view] { views_.push_back(view); })) {
+        return;
+    }
     view->document_ = this;
     UpdateFrameCounts();
 }
@@ -69,17 +83,21 @@ void UDocument::RemoveView(UView *view)
 
 void UDocument::UpdateAllViews(UView *sender, long hint, void *hintObject)
 {
-    // A view may close itself or another one while it is updated.
-    const std::vector<UView *> views = views_;
+    constexpr qsizetype usualViews = 32;
     const std::weak_ptr<const bool> life = life_;
-    for (UView *view : views) {
-        if (life.expired()) {
-            return; // the last view has closed the document
+    kareport::doneWhileMemoryLasts([&] {
+        // A view may close itself or another one while it is updated. Few are listed without a request for memory: none of
+        // them goes on to show what was there before.
+        const QVarLengthArray<UView *, usualViews> views(views_.begin(), views_.end());
+        for (UView *view : views) {
+            if (life.expired()) {
+                return; // the last view has closed the document
+            }
+            if (view != sender && std::find(views_.begin(), views_.end(), view) != views_.end()) {
+                kareport::doneWhileMemoryLasts([&] { view->OnUpdate(sender, hint, hintObject); });
+            }
         }
-        if (view != sender && std::find(views_.begin(), views_.end(), view) != views_.end()) {
-            view->OnUpdate(sender, hint, hintObject);
-        }
-    }
+    });
 }
 
 void UDocument::UpdateFrameCounts()
@@ -92,7 +110,7 @@ void UDocument::UpdateFrameCounts()
         } else if (pane != nullptr && pane->GetWindowNumber() != 0) {
             // It is not visible: it does not keep the document when the others are closed.
             pane->SetWindowNumber(0);
-            pane->UpdateTitle();
+            showTitle(*pane);
         }
     }
     // Nothing is collected: views count again when they are destroyed, where nothing may fail.
@@ -113,7 +131,7 @@ void UDocument::UpdateFrameCounts()
         const bool isUpdated = std::any_of(views_.begin(), view,
                                            [pane](const UView *earlier) { return earlier->GetParentPane() == pane; });
         if (pane != nullptr && !isUpdated) {
-            pane->UpdateTitle();
+            showTitle(*pane);
         }
     }
 }
@@ -158,10 +176,11 @@ void UDocument::OnCloseDocument()
 
 void UDocument::EndDocument()
 {
-    OnDocumentEvent(DocumentEvent::AfterCloseDocument);
-    DeleteContents();
+    // Nothing keeps a document from going.
+    kareport::doneWhileMemoryLasts([this] { OnDocumentEvent(DocumentEvent::AfterCloseDocument); });
+    kareport::doneWhileMemoryLasts([this] { DeleteContents(); });
     if (autoDelete_) {
-        OnAutoDelete();
+        kareport::doneWhileMemoryLasts([this] { OnAutoDelete(); });
         delete this;
     }
 }

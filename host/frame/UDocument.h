@@ -49,16 +49,18 @@ public:
 
     /// Views in the order in which they were added. The panes own them.
     const std::vector<UView *> &GetViews() const { return views_; }
-    /// Adds a view, which shows this document from then on. The view stays its pane's.
+    /// Adds a view, which shows this document from then on. The view stays its pane's. Without memory it is not added.
     void AddView(UView *view);
     /// Called by a view that is destroyed. A document closes with its last view, unless auto-delete is off.
     void RemoveView(UView *view);
-    /// Tells every view but the sender that the document has changed.
+    /// Tells every view but the sender that the document has changed. A view without memory for it does not keep the
+    /// others from being told.
     virtual void UpdateAllViews(UView *sender, long hint = 0, void *hintObject = nullptr);
     /// Numbers the panes that show the document; hidden ones have the number 0.
     virtual void UpdateFrameCounts();
 
-    /// Makes the document an unmodified one without a file, emptied by `DeleteContents`. @return false when that is not possible
+    /// Makes the document an unmodified one without a file, emptied by `DeleteContents`. @return false when that is not
+    /// possible
     virtual bool OnNewDocument();
     /// Loads a file through `Serialize`. @return false when it cannot be opened, with the document as it was, or not be
     /// read, with the document empty
@@ -67,7 +69,8 @@ public:
     virtual bool OnSaveDocument(const QString &path);
     /// Stores the document into an archive, or loads it from one; a plain document has nothing to store.
     virtual void Serialize(UArchive &archive);
-    /// Saves under a path and, with `replace`, makes it the document's own.
+    /// Saves under a path and, with `replace`, makes it the document's own. @return false when it is not saved, or when
+    /// there is no memory for the new path: the document then counts as modified where it did
     virtual bool DoSave(const QString &path, bool replace);
     /// Saves under the document's own path.
     bool DoFileSave();

@@ -1,7 +1,12 @@
 #include "UFormatAngle.h"
 
+#include "MemoryLasts.h"
+
 void UFormatAngle::ConvertToDMSformatString(char degreeMark, char minuteMark, char secondMark, QString &text)
 {
+    if (!kareport::doneWhileMemoryLasts([&text] { text.detach(); })) {
+        return;
+    }
     qsizetype kept = 0;
     QChar *const characters = text.data();
     for (qsizetype i = 0; i < text.size(); ++i) {

@@ -1,5 +1,9 @@
 #include "UFormatBearing.h"
 
+#include "MemoryLasts.h"
+
+#include <array>
+#include <charconv>
 #include <cmath>
 #include <numbers>
 
@@ -23,16 +27,30 @@ qint64 powerOfTen(qint32 exponent)
 
 void appendPadded(QString &text, qint64 number, int digits)
 {
-    const QString written = QString::number(number);
-    text.append(QString(qMax<qsizetype>(digits - written.size(), 0), u'0'));
-    text.append(written);
+    std::array<char, 24> written{};
+    const auto end = std::to_chars(written.data(), written.data() + written.size(), number).ptr;
+    const auto length = static_cast<int>(end - written.data());
+    for (int i = length; i < digits; ++i) {
+        text.append(u'0');
+    }
+    text.append(QLatin1StringView(written.data(), length));
+}
+
+/// Empties a text, whose memory it keeps where the text is the only one to use it.
+void empty(QString &text)
+{
+    if (text.isDetached()) {
+        text.resize(0);
+    } else {
+        text.clear();
+    }
 }
 
 } // namespace
 
 void UFormatBearing::ConvertToDisplayString(double value, QString &text) const
 {
-    text.clear();
+    empty(text);
     if (!std::isfinite(value)) {
         return;
     }
@@ -64,6 +82,13 @@ void UFormatBearing::ConvertToDisplayString(double value, QString &text) const
         count = 0;
     }
 
+    if (!kareport::doneWhileMemoryLasts([&] { appendCount(text, count, quarter); })) {
+        empty(text);
+    }
+}
+
+void UFormatBearing::appendCount(QString &text, qint64 count, qint64 quarter) const
+{
     if (style_ != 1) {
         appendAngle(text, count);
         return;

@@ -17,10 +17,12 @@ public:
         : unit_(unit), style_(style), decimals_(decimals), padding_(padding), reference_(reference)
     {}
 
-    /// Replaces `text` by the bearing; a value that is not finite gives "".
+    /// Replaces `text` by the bearing; a value that is not finite gives "", and so does the end of memory. A text that has
+    /// reserved enough needs none.
     void ConvertToDisplayString(double value, QString &text) const;
 
 private:
+    void appendCount(QString &text, qint64 count, qint64 quarter) const;
     void appendAngle(QString &text, qint64 count) const;
     void appendWhole(QString &text, qint64 whole) const;
     void appendDecimals(QString &text, qint64 fraction) const;

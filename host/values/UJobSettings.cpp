@@ -1,6 +1,7 @@
 #include "UJobSettings.h"
 
 #include "FixedNotation.h"
+#include "MemoryLasts.h"
 #include "UnitFactors.h"
 #include "VariableType.h"
 
@@ -87,9 +88,11 @@ void UJobSettings::appendUnitLength(TextBuffer &out, double value, const LengthF
 QString UJobSettings::UnitLengthToString(double value, bool fromInternal, bool withUnit, int decimals, int width,
                                          bool blankZero) const
 {
-    TextBuffer out;
-    appendUnitLength(out, value, {fromInternal, withUnit, decimals, width, blankZero});
-    return out.view().toString();
+    return kareport::whileMemoryLasts(QString(), [&] {
+        TextBuffer out;
+        appendUnitLength(out, value, {fromInternal, withUnit, decimals, width, blankZero});
+        return out.view().toString();
+    });
 }
 
 void UJobSettings::appendStation(TextBuffer &out, double value, const StationForm &form) const
@@ -131,8 +134,10 @@ QString UJobSettings::StationToString(double value, bool fromInternal, bool with
                                       int width, bool /*withZone*/, bool /*withEquation*/, bool blankZero,
                                       bool alignRight, bool trimZeros, bool showSign) const
 {
-    TextBuffer out;
-    appendStation(out, value,
-                  {fromInternal, withUnit, plain, decimals, width, blankZero, alignRight, trimZeros, showSign});
-    return out.view().toString();
+    return kareport::whileMemoryLasts(QString(), [&] {
+        TextBuffer out;
+        appendStation(out, value,
+                      {fromInternal, withUnit, plain, decimals, width, blankZero, alignRight, trimZeros, showSign});
+        return out.view().toString();
+    });
 }

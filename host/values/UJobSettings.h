@@ -40,8 +40,8 @@ struct StationForm
 
 /// The user's units and display formats. A value class: a report keeps its own copy.
 ///
-/// The functions whose names begin with `append` write after what a buffer holds, without an allocation; those that
-/// return a text are the same with a buffer of their own.
+/// The functions whose names begin with `append` write after what a buffer holds, without an allocation, and throw
+/// std::bad_alloc where it cannot grow; those that return a text are the same, and return "" without memory.
 class KAREPORT_EXPORT UJobSettings
 {
 public:

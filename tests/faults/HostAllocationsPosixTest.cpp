@@ -14,8 +14,8 @@
 #include <new>
 #include <ostream>
 
-// The host's own classes without memory. They say so by std::bad_alloc, as Qt and the standard library do, and what an
-// operation has begun is then done or not.
+// The host's own classes without memory: what an operation has begun is then done or not, and its answer says which. A few
+// hand a value out, or take one, and have no answer for that: they throw std::bad_alloc, and change nothing.
 
 namespace
 {
@@ -33,6 +33,8 @@ public:
         document = application.open();
         document->content = "content";
         other = application.open();
+        other->content = "other content";
+        other->SetPathName(savedPath, false);
         document->SetTitle(QStringLiteral("Title"));
         application.AddToRecentFileList(QStringLiteral("/recent/a"));
         spare = new RecordingPane(log);
@@ -47,6 +49,8 @@ public:
     HostSubject(const HostSubject &) = delete;
     HostSubject &operator=(const HostSubject &) = delete;
 
+    UDocTemplate &texts() const { return application.texts(); }
+
     /// All that operations may change.
     QString state()
     {
@@ -55,14 +59,18 @@ public:
             all.append(QStringLiteral("document %1, %2, %3, %4 views")
                            .arg(open->GetTitle(), open->GetPathName(),
                                 QString::fromLatin1(static_cast<const TextDocument *>(open)->content))
-                           .arg(open->GetViews().size()));
+                           .arg(open->GetViews().size()) +
+                       (open->IsModified() ? QStringLiteral(", modified") : QString()));
         }
         for (const CViewPane *pane : log.panes) {
-            all.append(QStringLiteral("pane %1, %2 views, visible: %3")
+            all.append(QStringLiteral("pane %1, %2 views, visible: %3, style %4%5")
                            .arg(pane->GetCaption())
                            .arg(pane->GetViews().size())
-                           .arg(pane->IsVisible()));
+                           .arg(pane->IsVisible())
+                           .arg(pane->GetStyle())
+                           .arg(pane->GetRect() ? QStringLiteral(", placed") : QString()));
         }
+        all.append(QStringLiteral("%1 templates").arg(application.GetDocTemplates().size()));
         all.append(application.GetRecentFileList().join(u' '));
         for (std::size_t i = 0; UDataObject *object = list.GetAt(i); ++i) {
             const UDictEntry *entry = object->Find(1);
@@ -75,10 +83,11 @@ public:
         }
         all.append(QString::fromStdString(contentOf(savedPath)));
         all.append(GetProfileString(QStringLiteral("Section"), QStringLiteral("Entry"), QStringLiteral("none")));
-        // The folder is another one each time, and a file that could not be opened may be a recent one all the same.
-        return QString(all.join(u'\n') + u'\n' + answer)
+        // The folder is another one each time. A file may be a recent one, also where it could not be opened, or not.
+        return QString(all.join(u'\n'))
             .replace(folder_.at(QString()), QStringLiteral("~"))
-            .replace(QStringLiteral("~a.txt /recent/a"), QStringLiteral("/recent/a"));
+            .replace(QStringLiteral("~a.txt /recent/a"), QStringLiteral("/recent/a"))
+            .replace(QStringLiteral("~s.txt /recent/a"), QStringLiteral("/recent/a"));
     }
 
 private:
@@ -97,14 +106,22 @@ public:
     RecordingView *spareView = nullptr;
     UDataObjectList list;
     UDictionary dictionary;
-    QString answer;
+    std::unique_ptr<RecordingView> newView = std::make_unique<RecordingView>();
+    const QRect place{1, 2, 300, 200};
+    std::unique_ptr<UDocTemplate> newTemplate = std::make_unique<UDocTemplate>(
+        2, UDocTemplate::DocumentFactory(), UDocTemplate::PaneFactory(), UDocTemplate::ViewFactory(), longName, 1, 1);
+    QStringList captions;
+    const std::vector<unsigned> ids{1};
 };
 
 struct HostOperation
 {
     const char *name;
-    void (*act)(HostSubject &subject);
-    bool mayEmpty = false; ///< a document that is read may be empty when that fails
+    bool (*act)(HostSubject &subject);                 ///< whether it says that all was done
+    void (*otherwise)(HostSubject &subject) = nullptr; ///< what it may leave where it fails, beside what was there
+    void (*atWorst)(HostSubject &subject) = nullptr;   ///< the same
+    bool throws = false;                               ///< there is no answer for it
+    bool isSilent = false;                             ///< nothing is lost where it is not done
 };
 
 void PrintTo(const HostOperation &operation, std::ostream *out)
@@ -112,96 +129,239 @@ void PrintTo(const HostOperation &operation, std::ostream *out)
     *out << operation.name;
 }
 
+void emptyUnread(HostSubject &s)
+{
+    s.document->content.clear();
+    s.document->SetModifiedFlag(true);
+}
+
+void modify(HostSubject &s)
+{
+    s.document->SetModifiedFlag(true);
+}
+
+CViewPane *paneOf(const HostSubject &s)
+{
+    return s.document->GetViews().front()->GetParentPane();
+}
+
 constexpr HostOperation operations[] = {
-    {"SetTitle", [](HostSubject &s) { s.document->SetTitle(longName); }},
-    {"SetPathName", [](HostSubject &s) { s.document->SetPathName(s.path, true); }},
-    {"AddView", [](HostSubject &s) { s.document->AddView(s.spareView); }},
-    {"UpdateAllViews", [](HostSubject &s) { s.document->UpdateAllViews(nullptr, 1, nullptr); }},
-    {"UpdateFrameCounts", [](HostSubject &s) { s.document->UpdateFrameCounts(); }},
-    {"ShowPane", [](HostSubject &s) { s.document->GetViews().front()->GetParentPane()->ShowPane(false); }},
-    {"SetWindowTextW", [](HostSubject &s) { s.spare->SetWindowTextW(longName); }},
-    {"IsShown",
-     [](HostSubject &s) { s.answer = s.document->IsShown() ? QStringLiteral("yes") : QStringLiteral("no"); }},
-    {"OnNewDocument", [](HostSubject &s) { s.document->OnNewDocument(); }, true},
-    {"OnOpenDocument", [](HostSubject &s) { s.document->OnOpenDocument(s.path); }, true},
-    {"OnSaveDocument", [](HostSubject &s) { s.document->OnSaveDocument(s.savedPath); }},
-    {"DoSave", [](HostSubject &s) { s.document->DoSave(s.savedPath, false); }},
+    {"SetTitle",
+     [](HostSubject &s) {
+         s.document->SetTitle(longName);
+         return static_cast<const UDocument *>(s.document)->GetTitle() == longName;
+     }},
+    {"SetPathName",
+     [](HostSubject &s) {
+         s.document->SetPathName(s.path, true);
+         return s.document->GetPathName() == s.path;
+     }},
+    {"AddView",
+     [](HostSubject &s) {
+         s.document->AddView(s.spareView);
+         return s.spareView->GetDocument() == s.document;
+     }},
+    {"AddView, to a pane",
+     [](HostSubject &s) {
+         s.spare->AddView(std::move(s.newView));
+         return s.spare->GetViews().size() == 2;
+     }},
+    {"UpdateAllViews",
+     [](HostSubject &s) {
+         s.document->UpdateAllViews(nullptr, 1, nullptr);
+         return true;
+     }},
+    {"UpdateFrameCounts",
+     [](HostSubject &s) {
+         s.document->UpdateFrameCounts();
+         return true;
+     }},
+    {"ShowPane",
+     [](HostSubject &s) {
+         paneOf(s)->ShowPane(false);
+         return true;
+     }},
+    {"SetPlace",
+     [](HostSubject &s) {
+         s.spare->SetPlace(nullptr, 7, &s.place);
+         return s.spare->GetRect() == s.place;
+     }},
+    {"SetWindowTextW",
+     [](HostSubject &s) {
+         s.spare->SetWindowTextW(longName);
+         return s.spare->GetWindowTextW() == longName;
+     }},
+    {"IsShown", [](HostSubject &s) { return s.document->IsShown(); }},
+    {"OnNewDocument", [](HostSubject &s) { return s.document->OnNewDocument(); }},
+    {"OnOpenDocument", [](HostSubject &s) { return s.document->OnOpenDocument(s.path); }, emptyUnread},
+    {"OnSaveDocument", [](HostSubject &s) { return s.document->OnSaveDocument(s.savedPath); }},
+    {"DoSave", [](HostSubject &s) { return s.document->DoSave(s.savedPath, false); }},
+    {"DoSave, under a new path",
+     [](HostSubject &s) {
+         s.document->SetModifiedFlag(true);
+         return s.document->DoSave(s.savedPath, true);
+     },
+     modify,
+     [](HostSubject &s) { // there was no memory for the path
+         s.document->OnSaveDocument(s.savedPath);
+         s.document->SetModifiedFlag(true);
+     }},
+    {"DoFileSave",
+     [](HostSubject &s) {
+         s.other->SetModifiedFlag(true);
+         return s.other->DoFileSave();
+     },
+     [](HostSubject &s) { s.other->SetModifiedFlag(true); }},
     {"SaveModified",
      [](HostSubject &s) {
          s.document->SetModifiedFlag(true);
-         s.answer = s.document->SaveModified() ? QStringLiteral("yes") : QStringLiteral("no");
-     }},
+         return s.document->SaveModified();
+     },
+     modify},
+    {"CanCloseFrame",
+     [](HostSubject &s) {
+         s.document->SetModifiedFlag(true);
+         return s.document->CanCloseFrame(paneOf(s));
+     },
+     modify},
     {"OpenReportDocumentFile, a new one",
-     [](HostSubject &s) { s.application.texts().OpenReportDocumentFile(QString(), 1, 1, nullptr, 0, nullptr); }},
+     [](HostSubject &s) { return s.texts().OpenReportDocumentFile(QString(), 1, 1, nullptr, 0, nullptr) != nullptr; }},
     {"OpenReportDocumentFile, of a file",
-     [](HostSubject &s) { s.application.texts().OpenReportDocumentFile(s.path, 1, 1, nullptr, 0, nullptr); }},
+     [](HostSubject &s) { return s.texts().OpenReportDocumentFile(s.path, 1, 1, nullptr, 0, nullptr) != nullptr; }},
     {"OpenReportDocumentFile, into a pane",
-     [](HostSubject &s) { s.application.texts().OpenReportDocumentFile(QString(), 1, 1, s.spare, 0, nullptr); }},
-    {"CreateNewPane", [](HostSubject &s) { s.application.texts().CreateNewPane(s.document, nullptr, 0, nullptr); }},
+     [](HostSubject &s) { return s.texts().OpenReportDocumentFile(QString(), 1, 1, s.spare, 0, nullptr) != nullptr; }},
+    {"CreateNewPane",
+     [](HostSubject &s) { return s.texts().CreateNewPane(s.document, nullptr, 0, nullptr) != nullptr; }},
     {"InitialUpdatePane",
      [](HostSubject &s) {
-         s.application.texts().InitialUpdatePane(s.document->GetViews().front()->GetParentPane(), s.document, 1);
+         paneOf(s)->ShowPane(false);
+         s.texts().InitialUpdatePane(paneOf(s), s.document, 1);
+         return paneOf(s)->IsVisible();
+     },
+     [](HostSubject &s) { paneOf(s)->ShowPane(false); }},
+    {"CloseAllDocuments",
+     [](HostSubject &s) {
+         s.application.CloseAllDocuments();
+         return s.texts().GetDocuments().empty();
      }},
-    {"AddToRecentFileList", [](HostSubject &s) { s.application.AddToRecentFileList(longName); }},
-    {"GetDocuments", [](HostSubject &s) { s.answer = QString::number(s.application.GetDocuments().size()); }},
-    {"IsOpen",
-     [](HostSubject &s) { s.answer = s.application.IsOpen(s.other) ? QStringLiteral("yes") : QStringLiteral("no"); }},
+    {"AddDocTemplate",
+     [](HostSubject &s) { return s.application.AddDocTemplate(std::move(s.newTemplate)) != nullptr; }},
+    {"AddToRecentFileList",
+     [](HostSubject &s) {
+         s.application.AddToRecentFileList(longName);
+         return s.application.GetRecentFileList().front() == longName;
+     }},
+    {"IsOpen", [](HostSubject &s) { return s.application.IsOpen(s.other); }},
+    {"Sort",
+     [](HostSubject &s) {
+         s.list.Sort(s.ids);
+         return true;
+     }},
+    {"Remove",
+     [](HostSubject &s) {
+         s.dictionary.Remove(7);
+         return s.dictionary.Find(7) == nullptr;
+     }},
+    {"WriteProfileString",
+     [](HostSubject &) {
+         WriteProfileString(QStringLiteral("Section"), QStringLiteral("Entry"), longName);
+         return true;
+     },
+     nullptr, nullptr, false, true},
+    {"GetDocuments", [](HostSubject &s) { return s.application.GetDocuments().size() == 2; }, nullptr, nullptr, true},
     {"GetPaneCaptions",
      [](HostSubject &s) {
-         QStringList captions;
-         CViewPane::GetPaneCaptions(captions);
-         s.answer = captions.join(u',');
+         CViewPane::GetPaneCaptions(s.captions);
+         return s.captions.size() == 3;
+     },
+     nullptr, nullptr, true},
+    {"Add, an object", [](HostSubject &s) { return &s.list.Add() == s.list.GetAt(3); }, nullptr, nullptr, true},
+    {"Set, another value",
+     [](HostSubject &s) {
+         s.dictionary.Set(8, QString(longName));
+         return true;
+     },
+     nullptr, nullptr, true},
+    {"Set, in the place of a value",
+     [](HostSubject &s) {
+         s.dictionary.Set(7, QString(longName));
+         return true;
      }},
-    {"Add, an object", [](HostSubject &s) { s.list.Add(); }},
-    {"Sort", [](HostSubject &s) { s.list.Sort({1}); }},
-    {"Set, another value", [](HostSubject &s) { s.dictionary.Set(8, QString(longName)); }},
-    {"Set, in the place of a value", [](HostSubject &s) { s.dictionary.Set(7, QString(longName)); }},
-    {"Refill", [](HostSubject &s) { s.dictionary.Refill<QString>(7) = longName; }},
-    {"Remove", [](HostSubject &s) { s.dictionary.Remove(7); }},
-    {"WriteProfileString",
-     [](HostSubject &) { WriteProfileString(QStringLiteral("Section"), QStringLiteral("Entry"), longName); }},
+    {"Refill",
+     [](HostSubject &s) {
+         s.dictionary.Refill<QString>(8) = longName;
+         return true;
+     },
+     nullptr, nullptr, true},
     {"GetProfileString",
-     [](HostSubject &s) { s.answer = GetProfileString(QString(), QStringLiteral("No entry"), longName); }},
+     [](HostSubject &) { return GetProfileString(QStringLiteral("Section"), QStringLiteral("No entry")).isEmpty(); },
+     nullptr, nullptr, true},
 };
 
 class HostAllocations : public testing::TestWithParam<HostOperation>
-{};
+{
+protected:
+    /// Does the operation with a request for memory failing. @return whether it failed
+    bool attempt(qint64 number)
+    {
+        HostSubject subject;
+        bool hasFailed = false;
+        bool isDone = false;
+        bool isThrown = false;
+        {
+            const FailingAllocation failing(number);
+            try {
+                isDone = GetParam().act(subject);
+            } catch (const std::bad_alloc &) {
+                isThrown = true;
+            }
+            hasFailed = failing.hasFailed();
+        }
+        EXPECT_TRUE(!isThrown || GetParam().throws) << number << ": an exception comes out";
+        const QString state = subject.state();
+        if (isDone) {
+            EXPECT_TRUE(state == after || (GetParam().isSilent && state == before))
+                << number << ", done: " << state.toStdString();
+        } else {
+            EXPECT_TRUE(hasFailed) << number;
+            EXPECT_TRUE(state == before || state == otherwise || state == atWorst)
+                << number << ": " << state.toStdString();
+        }
+        isEverThrown = isEverThrown || isThrown;
+        // What is there can be used.
+        if (subject.application.IsOpen(subject.other)) {
+            subject.other->SetTitle(QStringLiteral("Title again"));
+            EXPECT_EQ(static_cast<const UDocument *>(subject.other)->GetTitle(), QStringLiteral("Title again"));
+        }
+        return hasFailed && !HasFailure();
+    }
+
+    QString before;
+    QString after;
+    QString otherwise;
+    QString atWorst;
+    bool isEverThrown = false;
+};
 
 TEST_P(HostAllocations, AnyOfThemMayFail)
 {
-    QString before;
-    QString after;
     {
         HostSubject subject;
         before = subject.state();
-        GetParam().act(subject);
+        EXPECT_TRUE(GetParam().act(subject)) << "it does not work at all";
         after = subject.state();
     }
-    failingEachAllocation([&](qint64 number) {
+    const auto stateAfter = [this](void (*change)(HostSubject &)) {
         HostSubject subject;
-        bool hasFailed = false;
-        bool isDone = true;
-        try {
-            const FailingAllocation failing(number);
-            try {
-                GetParam().act(subject);
-            } catch (const std::bad_alloc &) {
-                isDone = false;
-            }
-            hasFailed = failing.hasFailed();
-        } catch (...) {
-            ADD_FAILURE() << number << ": another exception";
+        if (change != nullptr) {
+            change(subject);
         }
-        const QString state = subject.state();
-        EXPECT_TRUE(state == before || state == after || (GetParam().mayEmpty && subject.document->content.isEmpty()))
-            << number << (isDone ? ", done: " : ": ") << state.toStdString();
-        EXPECT_TRUE(hasFailed || state == after) << number;
-        EXPECT_TRUE(!isDone || !hasFailed || !GetParam().mayEmpty || state == before || state == after);
-        // What is there can be used.
-        subject.document->SetTitle(QStringLiteral("Title again"));
-        EXPECT_EQ(subject.document->GetTitle(), QStringLiteral("Title again"));
-        return hasFailed && !testing::Test::HasFailure();
-    });
+        return subject.state();
+    };
+    otherwise = stateAfter(GetParam().otherwise);
+    atWorst = stateAfter(GetParam().atWorst);
+    failingEachAllocation([this](qint64 number) { return attempt(number); });
+    EXPECT_EQ(isEverThrown, GetParam().throws) << "what its header says";
 }
 
 INSTANTIATE_TEST_SUITE_P(Operations, HostAllocations, testing::ValuesIn(operations), [](const auto &operation) {

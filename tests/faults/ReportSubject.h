@@ -1,9 +1,13 @@
 #pragma once
 
+#include "DataRemarks.h"
 #include "DataReport.h"
 #include "EditorFixture.h"
 #include "FailingAllocation.h"
 #include "LoadedText.h"
+#include "PageMark.h"
+#include "Placeholders.h"
+#include "ReportSurroundings.h"
 #include "ReportWindowFixture.h"
 #include "TemporaryFolder.h"
 #include "UDataObjectList.h"
@@ -12,6 +16,7 @@
 #include <QBuffer>
 
 #include <memory>
+#include <optional>
 #include <vector>
 
 /// A host document that takes the texts that users have written for its objects.
@@ -38,11 +43,22 @@ public:
             markup::output("Block", "Site", "Survey",
                            {markup::field("Number", "Point", "12"), markup::field("Note", "Note", "30")}),
             markup::separatorOption("124")));
+        folders_.putIntoLibrary(templateWithPlaceholders(), "placeholders.xml");
         SetUsePreferredReportEditorFlag(false);
         kareport::setDefaultPrinter({kareport::PrinterSource::None}); // no font is measured: see "What is not tried"
     }
 
 private:
+    /// The same data with a bearing, under labels with placeholders.
+    static QByteArray templateWithPlaceholders()
+    {
+        const std::vector<QByteArray> fields = {markup::field("Number", "Point of page {page}", "12"),
+                                                markup::field("Course", "Course in {angleUnit}", "20")};
+        return markup::surveyTemplate(markup::output("Table", "Points", "Survey", fields, {"Number"}),
+                                      markup::output("Block", "Site", "Survey", fields), markup::separatorOption("124"))
+            .replace("</VariableList>", markup::variable(11, "Course", "BEARING") + "</VariableList>");
+    }
+
     FixedSurroundings surroundings_;
     TemplateFolders folders_;
     TemporaryFolder folder_;
@@ -52,6 +68,7 @@ public:
     const PreferredEditor editor;
     const AnsweredBoxes boxes{MessageAnswer::No};
     const QString templatePath = folders_.libraryPath() + QStringLiteral("/t.xml");
+    const QString placeholdersPath = folders_.libraryPath() + QStringLiteral("/placeholders.xml");
     const QString loadPath = folder_.at(QStringLiteral("a.rep"));
     const QString richTextLoadPath = folder_.at(QStringLiteral("a.rtf"));
     const QString reportPath = folder_.at(QStringLiteral("s.rep"));
@@ -71,7 +88,8 @@ struct Shape
     bool isRichText = false;
     bool hasWindow = false;
     bool hasView = false;
-    bool isLoaded = false; ///< with its template, table and block
+    bool isLoaded = false;        ///< with its template, table and block
+    bool hasPlaceholders = false; ///< in its texts; and what is written is looked at for remarks
 };
 
 /// A report that holds a line, and what an operation on it needs.
@@ -96,14 +114,26 @@ public:
             pane_ = new CountingPane;
             showIn<TestReportView>(*pane_, report)->plainText = "a text that the user has edited\r\n";
         }
+        if (shape.hasPlaceholders) {
+            placeholders.emplace(UJobSettings(), QStringLiteral("TALVEN"), QDateTime(), std::nullopt);
+            remarks.measures = true;
+            kareport::ReportSurroundings surroundings;
+            surroundings.application = QStringLiteral("TALVEN");
+            surroundings.printer = {kareport::PrinterSource::None};
+            surroundings.placeholders = &*placeholders;
+            surroundings.remarks = &remarks;
+            report.SetSurroundings(surroundings);
+        }
         if (shape.isLoaded) {
-            EXPECT_TRUE(report.LoadTemplateXml(QStringLiteral("t.xml"), QStringLiteral("T"), QStringLiteral("Points"),
-                                               QStringLiteral("Site")));
+            EXPECT_TRUE(report.LoadTemplateXml(shape.hasPlaceholders ? QStringLiteral("placeholders.xml")
+                                                                     : QStringLiteral("t.xml"),
+                                               QStringLiteral("T"), QStringLiteral("Points"), QStringLiteral("Site")));
         }
         for (const char *name : {"first", "second", "third"}) {
             UDataObject &object = list.Add();
             object.Set(1, UPointNumber(QString::fromUtf8(name)));
             object.Set(6, QStringLiteral("a note"));
+            object.Set(11, 1.25);
         }
         report.WriteLine(QStringLiteral("before"), 0, 1, 0);
         report.SetHeading(QStringLiteral("Heading"), 1, 1);
@@ -120,6 +150,10 @@ public:
     ReportSubject(const ReportSubject &) = delete;
     ReportSubject &operator=(const ReportSubject &) = delete;
 
+    std::optional<kareport::Placeholders> placeholders;
+    kareport::DataRemarks remarks;
+    const QString marked =
+        QStringLiteral("on page ") + QChar(kareport::pageMark) + QStringLiteral(", which has memory");
     UReportDoc report;
     UDataObjectList list;
     QString answer; ///< what an operation gives back
