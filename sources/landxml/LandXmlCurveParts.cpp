@@ -29,8 +29,7 @@ QString textOf(CurveFault fault)
     case CurveFault::TooManyTurns: return Xlate("the element turns too many times");
     case CurveFault::TooSteep:
         return Xlate("the element turns by more than 45 degrees from its tangent: its form allows less");
-    case CurveFault::NoStraightEnd:
-        return Xlate("the element is curved at both ends: its form needs a straight end");
+    case CurveFault::NoStraightEnd: return Xlate("the element is curved at both ends: its form needs a straight end");
     }
     return {};
 }
