@@ -133,7 +133,7 @@ void UReportDoc::SetHeading(const QString &heading, int linesBefore, int linesAf
 
 void UReportDoc::WriteHeading()
 {
-    parts_->page.writeHeading();
+    parts_->page.losesNothing([this] { parts_->page.writeHeading(); });
 }
 
 void UReportDoc::SetHeader()

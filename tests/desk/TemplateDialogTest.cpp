@@ -84,10 +84,10 @@ QByteArray roads()
     return "<LandXML version='1.2'><Units><Imperial linearUnit='foot'/></Units>"
            "<CgPoints name='control'><CgPoint name='1'>0 10</CgPoint></CgPoints>"
            "<CgPoints name='as-built'><CgPoint name='2'>50 -10</CgPoint></CgPoints><Alignments>"
-           "<Alignment name='road'><CoordGeom><Line><Start>0 0</Start><End>100 0</End></Line></CoordGeom><Profile>"
+           "<Alignment name='road' staStart='0'><CoordGeom><Line><Start>0 0</Start><End>100 0</End></Line></CoordGeom><Profile>"
            "<ProfAlign name='design'><PVI>0 1</PVI><PVI>100 1</PVI></ProfAlign>"
            "<ProfSurf name='ground'><PntList2D>0 1 100 2</PntList2D></ProfSurf></Profile></Alignment>"
-           "<Alignment name='lane'><CoordGeom><Line><Start>0 0</Start><End>0 60</End></Line></CoordGeom></Alignment>"
+           "<Alignment name='lane' staStart='0'><CoordGeom><Line><Start>0 0</Start><End>0 60</End></Line></CoordGeom></Alignment>"
            "</Alignments></LandXML>";
 }
 

@@ -272,7 +272,7 @@ constexpr HostOperation operations[] = {
     {"GetPaneCaptions",
      [](HostSubject &s) {
          CViewPane::GetPaneCaptions(s.captions);
-         return s.captions.size() == 3;
+         return s.captions.size() == std::ssize(s.log.panes);
      },
      nullptr, nullptr, true},
     {"Add, an object", [](HostSubject &s) { return &s.list.Add() == s.list.GetAt(3); }, nullptr, nullptr, true},

@@ -7,6 +7,7 @@
 #include "LoadedText.h"
 #include "PageMark.h"
 #include "Placeholders.h"
+#include "ReportAccess.h"
 #include "ReportSurroundings.h"
 #include "ReportWindowFixture.h"
 #include "TemporaryFolder.h"
@@ -120,9 +121,8 @@ public:
             kareport::ReportSurroundings surroundings;
             surroundings.application = QStringLiteral("TALVEN");
             surroundings.printer = {kareport::PrinterSource::None};
-            surroundings.placeholders = &*placeholders;
-            surroundings.remarks = &remarks;
             report.SetSurroundings(surroundings);
+            kareport::ReportAccess::setHooks(report, {&*placeholders, &remarks});
         }
         if (shape.isLoaded) {
             EXPECT_TRUE(report.LoadTemplateXml(shape.hasPlaceholders ? QStringLiteral("placeholders.xml")
