@@ -1,3 +1,4 @@
+#include "CompressedFaces.h"
 #include "PdfExport.h"
 #include "ProcessorTime.h"
 #include "UReportDoc.h"
@@ -49,6 +50,31 @@ void pdfPages(benchmark::State &state)
     time.report(state, static_cast<double>(state.range(0)));
 }
 BENCHMARK(pdfPages)->Arg(100)->Arg(1000)->Arg(10'000)->Unit(benchmark::kMillisecond);
+
+/// A page, in a process that has written such a page before: with the face that was kept of it, or without.
+void pdfOfOnePage(benchmark::State &state)
+{
+    kareport::setProfileStore(kareport::makeMemoryProfile());
+    UReportDoc report;
+    report.FixPage(72, 80);
+    report.SetPageSize();
+    writeRows(report, 72);
+    const QByteArray others(kareport::CompressedFaces::mostBytes - 1, 'x');
+    const bool isKept = state.range(0) != 0;
+    for (auto _ : state) {
+        if (!isKept) {
+            state.PauseTiming();
+            kareport::CompressedFaces::ofProcess().keep(others, "x"); // which takes the place of all else
+            state.ResumeTiming();
+        }
+        QBuffer pdf;
+        pdf.open(QIODevice::WriteOnly);
+        if (!report.WritePdf(pdf)) {
+            state.SkipWithError("the PDF could not be written");
+        }
+    }
+}
+BENCHMARK(pdfOfOnePage)->ArgName("kept")->Arg(0)->Arg(1)->Unit(benchmark::kMillisecond);
 
 void saveReportFile(benchmark::State &state)
 {

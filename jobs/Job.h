@@ -55,6 +55,16 @@ struct Job
         std::optional<QString> chainageLabel;
         std::optional<char16_t> separator;
     };
+    /// What PDFs of the report say of themselves.
+    struct Pdf
+    {
+        std::optional<QString> title; ///< nothing for the report's own
+        QString author;
+        std::optional<QString> creator; ///< nothing for the job's application
+        QString language;
+        bool outline = true;
+        bool pageLabels = true;
+    };
     struct DataSet
     {
         QString kind;                             ///< the key of its kind, whose value says where the data is
@@ -118,6 +128,7 @@ struct Job
     QHash<QString, DataSet> data;
     std::vector<Step> steps;
     std::vector<Output> outputs;
+    std::shared_ptr<const Pdf> pdf; ///< null when PDFs have their pages alone
 };
 
 /// The short form of a job: a data file written through one table or block of a template.

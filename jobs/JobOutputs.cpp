@@ -1,6 +1,7 @@
 #include "JobOutputs.h"
 
 #include "Interrupt.h"
+#include "JobRunner.h"
 #include "PdfExport.h"
 #include "ProcessSetup.h"
 #include "ReplaceFile.h"
@@ -138,10 +139,11 @@ private:
     bool writePdfTo(QIODevice &device, QString &problem)
     {
         PdfNotes notes;
-        const bool done = report_.WritePdf(device, &notes, [this](qint64 page, qint64 pages) {
+        const auto progress = [this](qint64 page, qint64 pages) {
             progress_.advance(static_cast<std::size_t>(page), static_cast<std::size_t>(pages));
             return !isInterrupted() && !(output_.isStandardOutput() && isOutputReaderGone());
-        });
+        };
+        const bool done = report_.WritePdf(device, &notes, progress, output_.pdf.get());
         problem = notes.problem;
         warnings_ += notes.warnings();
         for (const MissingCharacter &missing : notes.missing) {
@@ -186,6 +188,24 @@ std::optional<QString> replaceOutput(const Output &output, const WriteContent &w
     return done ? std::nullopt
                 : std::optional(
                       Xlate("\"%1\" could not be written: %2").arg(output.file, problem.isEmpty() ? error : problem));
+}
+
+void describePdfs(const Job &job, const UReportDoc &report, std::vector<Output> &outputs)
+{
+    if (job.pdf == nullptr) {
+        return;
+    }
+    auto details = std::make_shared<PdfDetails>();
+    details->title = job.pdf->title.value_or(report.GetTitle());
+    details->author = job.pdf->author;
+    details->creator = job.pdf->creator.value_or(job.application);
+    details->created = surroundingsOf(job).time;
+    details->language = job.pdf->language;
+    details->hasOutline = job.pdf->outline;
+    details->hasPageLabels = job.pdf->pageLabels;
+    for (Output &output : outputs) {
+        output.pdf = output.kind == OutputKind::Pdf ? details : nullptr;
+    }
 }
 
 OutputResult writeOutput(UReportDoc &report, const Output &output, Progress &progress)

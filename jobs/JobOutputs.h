@@ -26,6 +26,10 @@ struct OutputResult
     bool isWritten() const { return !problem && !isReaderGone; }
 };
 
+/// Gives the PDFs among the outputs of a job what they say of themselves, where the job asks for it.
+/// @param report  that was made, for its title
+void describePdfs(const Job &job, const UReportDoc &report, std::vector<Output> &outputs);
+
 /// Writes a report to where an output says. An empty report makes no report file.
 OutputResult writeOutput(UReportDoc &report, const Output &output, Progress &progress);
 

@@ -1,6 +1,8 @@
 #include "JobSteps.h"
 
 #include "NearestName.h"
+#include "PageMark.h"
+#include "ReportOutline.h"
 #include "TemplateCheck.h"
 #include "UXmlReportTpl.h"
 #include "Xlate.h"
@@ -38,7 +40,9 @@ std::optional<InputError> JobSteps::write()
 
 JobSteps::Wrong JobSteps::write(const Job::Heading &step, const JsonPath & /*path*/)
 {
-    report_.SetHeading(shownText(step.text), step.before, step.after);
+    const QString text = shownText(step.text);
+    report_.AnnounceEntry(ReportOutline::headingLevel, QString(text).remove(QChar(pageMark)).simplified());
+    report_.SetHeading(text, step.before, step.after);
     return std::nullopt;
 }
 
@@ -135,6 +139,7 @@ JobSteps::Wrong JobSteps::write(const Job::Table &step, const JsonPath &path)
     if (auto wrong = noteSortKeys(record)) {
         return wrong;
     }
+    report_.AnnounceEntry(ReportOutline::tableLevel, table->Name);
     needMemory(report_.WriteDataTable(step.name, &rows, step.before, step.after, step.headingAfter));
     if (const auto error = rows.error()) {
         return error;

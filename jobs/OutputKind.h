@@ -1,7 +1,10 @@
 #pragma once
 
+#include "PdfDetails.h"
+
 #include <QString>
 
+#include <memory>
 #include <optional>
 
 namespace kareport
@@ -30,7 +33,8 @@ struct Output
 {
     QString file; ///< "-" for standard output
     OutputKind kind = OutputKind::Text;
-    std::optional<qint64> mostBytes = std::nullopt; ///< none when it may have any size
+    std::optional<qint64> mostBytes = std::nullopt;  ///< none when it may have any size
+    std::shared_ptr<const PdfDetails> pdf = nullptr; ///< what a PDF says of itself; null when it has its pages alone
 
     bool isStandardOutput() const { return file == u"-"; }
 };

@@ -157,6 +157,20 @@ bool isPageHeader(QStringView line)
     return isHeader(line);
 }
 
+std::optional<int> pageNumberOf(QStringView line)
+{
+    constexpr qsizetype mostDigits = 9;
+    if (!isPageHeader(line)) {
+        return std::nullopt;
+    }
+    const QStringView trimmed = line.trimmed();
+    qsizetype digits = 0;
+    while (digits < trimmed.size() && isDigit(trimmed[trimmed.size() - 1 - digits])) {
+        ++digits;
+    }
+    return digits <= mostDigits ? std::optional(trimmed.last(digits).toInt()) : std::nullopt;
+}
+
 std::vector<qint64> pageHeadersIn(QStringView text)
 {
     return findHeaders(text);

@@ -27,6 +27,9 @@ QString pageHeaderHour(const QDateTime &time);
 /// label of the page number and the number.
 bool isPageHeader(QStringView line);
 
+/// The number of the page that a page header ends with; nothing for any other line, and for a number of more than nine digits.
+std::optional<int> pageNumberOf(QStringView line);
+
 /// Where the lines of a text begin that are page headers.
 std::vector<qint64> pageHeadersIn(QStringView text);
 std::vector<qint64> pageHeadersIn(QLatin1StringView text);

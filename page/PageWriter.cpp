@@ -25,6 +25,16 @@ bool PageWriter::tellWritten(View text, int style)
 }
 
 template <typename View>
+void PageWriter::placeEntries(qint64 at, View text)
+{
+    if constexpr (std::is_same_v<View, QStringView>) {
+        outline_.place(at, text);
+    } else if (!doneWhileMemoryLasts([&] { outline_.place(at, QString(text)); })) {
+        outline_.place(at, u"."); // a line that most likely shows something
+    }
+}
+
+template <typename View>
 bool PageWriter::writeText(View text, int style)
 {
     const bool isOwn = text_.owns(text);
@@ -40,6 +50,9 @@ bool PageWriter::writeText(View text, int style)
         } else {
             text = text_.narrowView().sliced(before);
         }
+    }
+    if (outline_.isWaiting()) {
+        placeEntries(before, text);
     }
     lineNumber_ += lineFeeds;
     lineCount_ += lineFeeds;
@@ -88,6 +101,13 @@ void PageWriter::notePageStart()
 {
     if (outlet_ == nullptr && !doneWhileMemoryLasts([this] { starts_.add(text_.size()); })) {
         noteLostText(); // the text is whole, its pages are not
+    }
+}
+
+void PageWriter::announceEntry(int level, const QString &text)
+{
+    if (outlet_ == nullptr && !doneWhileMemoryLasts([&] { outline_.announce(level, text); })) {
+        noteLostText(); // the text is whole, its outline is not
     }
 }
 

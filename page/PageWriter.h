@@ -3,6 +3,7 @@
 #include "MemoryLasts.h"
 #include "PageDefaults.h"
 #include "PageStarts.h"
+#include "ReportOutline.h"
 #include "ReportText.h"
 #include "TextOutlet.h"
 
@@ -61,6 +62,11 @@ public:
     /// Where each page begins. A text that is handed on has no record: its pages cannot be looked at.
     const PageStarts &pageStarts() const { return starts_; }
     void setPageStarts(std::vector<qint64> starts) { starts_.assign(std::move(starts)); }
+    /// The report's outline. A text that is handed on has none.
+    const ReportOutline &outline() const { return outline_; }
+    /// Announces an entry of the outline for what is written next. @param level, text  as `OutlineEntry` has them
+    void announceEntry(int level, const QString &text);
+    void clearOutline() { outline_.clear(); }
     /// Exchanges the text for another one. @param lineEnds  counted as if they had been written
     void exchangeText(ReportText &text, std::vector<qint64> pageStarts, qint64 lineEnds);
     /// Replaces a piece of the text and carries the page starts along.
@@ -141,6 +147,8 @@ private:
     template <typename View>
     bool tellWritten(View text, int style);
     template <typename View>
+    void placeEntries(qint64 at, View text);
+    template <typename View>
     void writeTextLine(View text, int linesAfter, int style);
     bool isNumbered(QStringView text) const;
     void writeHeadingText();
@@ -161,6 +169,7 @@ private:
     PageWriterObserver *observer_;
     ReportText text_;
     PageStarts starts_;
+    ReportOutline outline_;
     TextOutlet *outlet_ = nullptr;
     quint64 losses_ = 0;
     int lineNumber_ = 0;

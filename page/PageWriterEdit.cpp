@@ -9,6 +9,7 @@ void PageWriter::clear()
 {
     text_.clear();
     starts_.clear();
+    outline_.clear();
     losses_ = 0;
     lineCount_ = 0;
     heading_.text.clear();
@@ -21,6 +22,7 @@ bool PageWriter::emptyIntoOutlet()
     losesNothing([&] { isTaken = text_.visit([this](auto text) { return outlet_->write(text); }); });
     text_.drain();
     starts_.clear();
+    outline_.clear();
     return isTaken;
 }
 
@@ -28,6 +30,7 @@ void PageWriter::exchangeText(ReportText &text, std::vector<qint64> pageStarts, 
 {
     text_.swap(text);
     starts_.assign(std::move(pageStarts));
+    outline_.clear();
     lineNumber_ += static_cast<int>(lineEnds);
     lineCount_ += lineEnds;
 }
@@ -41,15 +44,18 @@ bool PageWriter::replace(qint64 at, qint64 removed, QStringView inserted)
         if (text_.owns(inserted)) {
             return replace(at, removed, inserted.toString());
         }
-        const bool wantsRemoved = starts_.wantsRemoved(at, removed, inserted.size());
-        const QString removedText = wantsRemoved ? text_.piece(at, removed) : QString();
+        const bool isForStarts = starts_.wantsRemoved(at, removed, inserted.size());
+        const bool isWanted = isForStarts || outline_.wantsRemoved(at, removed);
+        const QString removedText = isWanted ? text_.piece(at, removed) : QString();
         const bool mayBeHeader = inserted.size() > PageStarts::shortestHeader;
         const bool beginsLine = at == 0 || (mayBeHeader && text_.piece(at - 1, 1) == u"\n");
-        PageStarts::Edit edit = starts_.prepare(at, removed, removedText, inserted, beginsLine);
+        PageStarts::Edit edit =
+            starts_.prepare(at, removed, isForStarts ? removedText : QString(), inserted, beginsLine);
         if (!text_.replace(at, removed, inserted)) {
             return false;
         }
         starts_.carryOut(std::move(edit));
+        outline_.carry(at, removed, removedText, inserted);
         return true;
     });
 }

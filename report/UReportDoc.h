@@ -27,6 +27,7 @@ namespace kareport
 class ReportTextWriter;
 class ReportWindow;
 enum class LineEnds;
+struct PdfDetails;
 struct PdfNotes;
 struct ReportAccess;
 struct ReportPage;
@@ -122,6 +123,12 @@ public:
     /// Writes a line: blank lines before it (dropped where a page begins), the text, and line ends after it; 0 after
     /// leaves the line open. Below 0 before forces a new page.
     void WriteLine(const QString &text, int linesBefore, int linesAfter, int style);
+
+    /// Announces an entry of the report's outline, which leads to what is written next. Nothing while the text is handed on.
+    /// @param level  0 for a heading, 1 for a table, from 2 on for groups within groups: an entry belongs to the last one
+    ///               before it with a smaller level
+    /// @param text   empty for none, which ends what belongs to the entries of this level and of greater ones
+    void AnnounceEntry(int level, const QString &text);
 
     /// Sets the text that repeats under the header of every page.
     void SetHeading(const QString &heading, int linesBefore, int linesAfter);
@@ -371,9 +378,11 @@ public:
     bool WriteText(QIODevice &device, kareport::LineEnds lineEnds) const;
     /// Writes the text to an open device as a PDF. @param notes  receives what is missing or went wrong; may be null
     /// @param progress  receives the pages done and all pages; its false stops the work. May be empty
+    /// @param details  what the PDF says of itself, with the outline that was announced; null for its pages alone
     /// @return false when there is no measured page or no font, a write fails, or the work was stopped
     bool WritePdf(QIODevice &device, kareport::PdfNotes *notes = nullptr,
-                  const std::function<bool(qint64, qint64)> &progress = {}) const;
+                  const std::function<bool(qint64, qint64)> &progress = {},
+                  const kareport::PdfDetails *details = nullptr) const;
 
     // --- Opening: UReportDocOpen.cpp --------------------------------------------------------------------------------
 

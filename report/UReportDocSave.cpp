@@ -176,7 +176,8 @@ bool UReportDoc::WriteText(QIODevice &device, kareport::LineEnds lineEnds) const
 }
 
 bool UReportDoc::WritePdf(QIODevice &device, kareport::PdfNotes *notes,
-                          const std::function<bool(qint64, qint64)> &progress) const
+                          const std::function<bool(qint64, qint64)> &progress,
+                          const kareport::PdfDetails *details) const
 {
     bool isWritten = false;
     const auto write = [&] {
@@ -186,12 +187,16 @@ bool UReportDoc::WritePdf(QIODevice &device, kareport::PdfNotes *notes,
         options.page = {geometry.pageSize, geometry.resolution, layout.margins, layout.fontSize, geometry.linesPerPage};
         options.pageStarts = GetPageStarts();
         options.progress = progress;
+        options.details = details;
         if (HoldsRichTextSource()) {
             // The text of the document, not its source.
             const QString shown = kareport::shownPlainText(*this);
             options.pageStarts = kareport::pageHeadersIn(shown);
             isWritten = kareport::writePdf(device, QStringView(shown), options, notes);
             return;
+        }
+        if (details != nullptr) {
+            options.outline = parts_->page.outline().entries();
         }
         isWritten =
             parts_->page.text().visit([&](auto text) { return kareport::writePdf(device, text, options, notes); });

@@ -72,6 +72,7 @@ void UReportDoc::SetData(const QString &text)
 {
     ++parts_->editCount;
     parts_->page.setPageStarts({});
+    parts_->page.clearOutline();
     if (!parts_->page.text().assign(text)) {
         parts_->page.noteLostText();
     }
@@ -124,6 +125,11 @@ void UReportDoc::WriteLine(const QString &text, int linesBefore, int linesAfter,
 {
     parts_->page.losesNothing(
         [&] { parts_->page.writeNumberedLine(text, text.size(), linesBefore, linesAfter, style); });
+}
+
+void UReportDoc::AnnounceEntry(int level, const QString &text)
+{
+    parts_->page.announceEntry(level, text);
 }
 
 void UReportDoc::SetHeading(const QString &heading, int linesBefore, int linesAfter)

@@ -1988,6 +1988,11 @@
     </message>
     <message>
         <location filename="../jobs/JobReader.cpp"/>
+        <source>a language such as de or en-GB was expected</source>
+        <translation>eine Sprache wie de oder en-GB wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
         <source>the key "file" was expected</source>
         <translation>der Schlüssel "file" wurde erwartet</translation>
     </message>
@@ -3059,6 +3064,11 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Pro&amp;gram</source>
         <translation>Pro&amp;gramm</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SaveAs.cpp"/>
+        <source>PDF with outline and page numbers (%1)</source>
+        <translation>PDF mit Gliederung und Seitenzahlen (%1)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>

@@ -1988,6 +1988,11 @@
     </message>
     <message>
         <location filename="../jobs/JobReader.cpp"/>
+        <source>a language such as de or en-GB was expected</source>
+        <translation>de や en-GB のような言語が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobReader.cpp"/>
         <source>the key "file" was expected</source>
         <translation>キー "file" が必要です</translation>
     </message>
@@ -3059,6 +3064,11 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Pro&amp;gram</source>
         <translation>プログラム(&amp;G)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/SaveAs.cpp"/>
+        <source>PDF with outline and page numbers (%1)</source>
+        <translation>しおりとページ番号付きの PDF (%1)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>

@@ -1,6 +1,8 @@
 #include "SaveAs.h"
 
 #include "AppMessageBox.h"
+#include "ApplicationTitle.h"
+#include "Clock.h"
 #include "FileIdentity.h"
 #include "FileKind.h"
 #include "Folders.h"
@@ -29,8 +31,9 @@ namespace
 /// A kind of file that a save dialog offers.
 struct OfferedKind
 {
-    QString title;   ///< as Qt shows it, with its pattern
-    QString pattern; ///< "*" for all files
+    QString title;           ///< as Qt shows it, with its pattern
+    QString pattern;         ///< "*" for all files
+    bool hasOutline = false; ///< a PDF with one
 };
 
 std::vector<OfferedKind> kindsOf(const QString &filter)
@@ -45,6 +48,17 @@ std::vector<OfferedKind> kindsOf(const QString &filter)
             {parts[i].section(QStringLiteral(" ("), 0, 0) + QStringLiteral(" (") + pattern + u')', pattern});
     }
     return kinds;
+}
+
+/// Puts PDFs with an outline after those without, where reports are saved.
+void addOutlineKind(std::vector<OfferedKind> &kinds)
+{
+    const auto pdf =
+        std::find_if(kinds.begin(), kinds.end(), [](const OfferedKind &kind) { return isPdfName(kind.pattern); });
+    if (pdf != kinds.end()) {
+        const QString pattern = pdf->pattern;
+        kinds.insert(pdf + 1, {Xlate("PDF with outline and page numbers (%1)").arg(pattern), pattern, true});
+    }
 }
 
 /// Qt's dialog takes names in folders that are not there. @return false, after a message
@@ -84,9 +98,19 @@ bool mayReplace(const QString &path, const SaveRequest &request)
                         MessageButtons::YesNo, MessageIcon::Question}) == MessageAnswer::Yes;
 }
 
-/// Writes a report as a PDF, and reports what is not in it or why it could not be written.
-void exportPdf(const UReportDoc &report, const QString &path)
+PdfDetails detailsOf(const UReportDoc &report)
 {
+    PdfDetails details;
+    details.title = report.GetTitle();
+    details.creator = GetApplicationTitle();
+    details.created = currentTime();
+    return details;
+}
+
+/// Writes a report as a PDF, and reports what is not in it or why it could not be written.
+void exportPdf(const UReportDoc &report, const SaveChoice &choice)
+{
+    const QString &path = choice.path;
     PdfNotes notes;
     QString problem;
     bool isWritten = false;
@@ -97,8 +121,11 @@ void exportPdf(const UReportDoc &report, const QString &path)
     } else {
         const WaitCursor cursor;
         finishLoading(report);
-        isWritten = replaceFile(
-            path, [&report, &notes](QIODevice &device) { return report.WritePdf(device, &notes); }, &problem);
+        const PdfDetails details = detailsOf(report);
+        const auto write = [&](QIODevice &device) {
+            return report.WritePdf(device, &notes, {}, choice.hasOutline ? &details : nullptr);
+        };
+        isWritten = replaceFile(path, write, &problem);
     }
     if (!isWritten) {
         sayNotSaved(path, notes.problem.isEmpty() ? problem : notes.problem);
@@ -118,9 +145,12 @@ QString withEndingOf(const QString &path, const QString &kind, const QStringList
     return isKnown || !kind.startsWith(u"*.") ? path : path + kind.sliced(path.endsWith(u'.') ? 2 : 1);
 }
 
-std::optional<QString> askSavePath(QWidget *parent, const SaveRequest &request)
+std::optional<SaveChoice> askSavePath(QWidget *parent, const SaveRequest &request)
 {
-    const std::vector<OfferedKind> kinds = kindsOf(request.filter);
+    std::vector<OfferedKind> kinds = kindsOf(request.filter);
+    if (dynamic_cast<const UReportDoc *>(request.document) != nullptr) {
+        addOutlineKind(kinds);
+    }
     QStringList titles;
     QStringList patterns;
     for (const OfferedKind &kind : kinds) {
@@ -142,23 +172,26 @@ std::optional<QString> askSavePath(QWidget *parent, const SaveRequest &request)
         const qsizetype chosen = titles.indexOf(dialog.selectedNameFilter());
         QString path = withEndingOf(dialog.selectedFiles().value(0), patterns.value(chosen), patterns);
         if (hasFolder(path, request) && mayReplace(path, request)) {
-            return path;
+            return SaveChoice(path, chosen >= 0 && kinds[static_cast<std::size_t>(chosen)].hasOutline);
         }
     }
     return std::nullopt;
 }
 
 std::optional<QString> askOwnName(const SaveRequest &request,
-                                  const std::function<std::optional<QString>(const SaveRequest &)> &ask)
+                                  const std::function<std::optional<SaveChoice>(const SaveRequest &)> &ask)
 {
-    auto path = ask(request);
+    const auto choice = ask(request);
+    if (!choice) {
+        return std::nullopt;
+    }
     const auto *report = dynamic_cast<const UReportDoc *>(request.document);
     // The report may have been closed while the dialog was open.
-    if (!path || report == nullptr || !isPdfName(*path) || !UReportDoc::IsReportAvailable(report)) {
-        return path;
+    if (report == nullptr || !isPdfName(choice->path) || !UReportDoc::IsReportAvailable(report)) {
+        return choice->path;
     }
-    SetLastOpenDir(*path, lastReportFolder);
-    exportPdf(*report, *path);
+    SetLastOpenDir(choice->path, lastReportFolder);
+    exportPdf(*report, *choice);
     return std::nullopt;
 }
 

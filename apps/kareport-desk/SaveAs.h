@@ -13,15 +13,24 @@ class QWidget;
 namespace kareport
 {
 
+/// What the user chose in a save dialog.
+struct SaveChoice
+{
+    SaveChoice(const QString &chosen, bool outline = false) : path(chosen), hasOutline(outline) {}
+
+    QString path;
+    bool hasOutline; ///< of a PDF: it has title, outline and page labels
+};
+
 /// Asks for the name of a file to save in. Its ending follows the kind that is chosen, and a file is only replaced when the
-/// user says so.
-std::optional<QString> askSavePath(QWidget *parent, const SaveRequest &request);
+/// user says so. A report may become a PDF with an outline as well.
+std::optional<SaveChoice> askSavePath(QWidget *parent, const SaveRequest &request);
 
 /// Asks for the name of a file that becomes the report's own. A PDF can never be that, as it cannot be opened again: when
 /// the user names one, the report is exported into it, and the answer is that of a cancelled dialog.
 /// @param ask  asks for a name of any kind
 std::optional<QString> askOwnName(const SaveRequest &request,
-                                  const std::function<std::optional<QString>(const SaveRequest &)> &ask);
+                                  const std::function<std::optional<SaveChoice>(const SaveRequest &)> &ask);
 
 /// A typed name with the ending of a kind. An ending that names another kind stays.
 /// @param kind, kinds  name patterns ("*.rep") of the kind that is chosen and of all kinds; "*" asks for no ending

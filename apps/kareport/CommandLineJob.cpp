@@ -252,6 +252,7 @@ ExitStatus CommandLineJob::run(Progress &progress)
         status_ = checkCharacters(report, progress);
     }
     if (status_ == exitDone) {
+        describePdfs(job_, report, job_.outputs);
         status_ = writeOutputs(report, job_.outputs, progress, command_.quiet, &notes_);
     }
     return status_ = withNotes(status_);

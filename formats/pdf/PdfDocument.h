@@ -1,5 +1,6 @@
 #pragma once
 
+#include "PdfDetails.h"
 #include "PdfFaces.h"
 
 #include <QByteArray>
@@ -32,13 +33,27 @@ public:
     HPDF_Font loadFace(const PdfFace &face);
     /// @return null after an error
     HPDF_Page addPage();
+    /// The page that was added last; null before the first.
+    HPDF_Page lastPage() const { return lastPage_; }
+    /// Says what the document is. @return false after an error
+    bool describe(const PdfDetails &details);
+    /// Adds an entry to the outline, as the last one of its parent. @param parent  null for the outline itself
+    /// @return null after an error
+    HPDF_Outline addOutline(HPDF_Outline parent, const QString &text);
+    /// Has viewers show the outline beside the pages. @return false after an error
+    bool showOutline();
+    /// Numbers the sheets from one on. @param sheet  from 0. @return false after an error
+    bool addLabel(unsigned sheet, unsigned number, const QByteArray &prefix);
     /// Writes the finished document to an open device. @return false after an error of the library or of the device
     bool save(QIODevice &device);
 
 private:
     static void noteError(HPDF_STATUS error, HPDF_STATUS detail, void *self);
 
+    bool addText(HPDF_Dict dictionary, const char *key, const QString &text);
+
     HPDF_Doc document_;
+    HPDF_Page lastPage_ = nullptr;
     HPDF_STATUS error_ = HPDF_OK;
 };
 

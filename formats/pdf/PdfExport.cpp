@@ -4,7 +4,9 @@
 #include "FixedPitchFont.h"
 #include "LineBreaker.h"
 #include "MemoryLasts.h"
+#include "PageHeader.h"
 #include "PdfDocument.h"
+#include "PdfNavigation.h"
 #include "PdfText.h"
 #include "PdfTypesetter.h"
 #include "ReportPages.h"
@@ -55,7 +57,7 @@ public:
         // A sheet of a page's continuation holds a line, or a cell of a broken one, at least.
         const qint64 sheets =
             static_cast<qint64>(pages.size()) + lines + (notes_.broken.count > 0 ? 8 * text_.size() : 0);
-        if (!pdf_.expectPages(sheets) || !addPages(pages) || !typesetter_.finish()) {
+        if (!pdf_.expectPages(sheets) || !addPages(pages) || !addDetails() || !typesetter_.finish()) {
             return fail(libraryError());
         }
         // A device that fails reports the reason itself.
@@ -143,6 +145,7 @@ private:
             }
             QString &visible = lines_[line];
             visibleLine(text_.sliced(at, lineEnd - at), visible);
+            places_.addLine(lineEnd, pieces_.size());
             ++lineNumber_;
             if (!typesetter_.coversAll()) {
                 typesetter_.prepare(visible, [this](char32_t character) { noteMissing(character); });
@@ -155,11 +158,28 @@ private:
             }
             at = lineEnd + 1;
         }
-        return addSheets();
+        if (!addSheets()) {
+            return false;
+        }
+        if (options_.details != nullptr) {
+            const auto number = lines_.empty() || line == 0 ? std::nullopt : pageNumberOf(lines_.front());
+            pageNumber_ = number ? *number : pageNumber_ + 1;
+            labels_.addPage(static_cast<unsigned>(pageNumber_), sheetsOfPage_);
+        }
+        return true;
+    }
+
+    bool addDetails()
+    {
+        const PdfDetails *details = options_.details;
+        return details == nullptr ||
+               (pdf_.describe(*details) && (!details->hasOutline || writeOutline(pdf_, places_.places())) &&
+                (!details->hasPageLabels || writePageLabels(pdf_, labels_.labels())));
     }
 
     bool addSheets()
     {
+        sheetsOfPage_ = 0;
         const LinePlacement placement =
             placeLines(fontSize_, box_, typesetter_.height(), linesToFit_, static_cast<qsizetype>(pieces_.size()));
         std::span<const QStringView> left(pieces_);
@@ -168,6 +188,8 @@ private:
             if (!typesetter_.addPage(box_, placement, taken)) {
                 return false;
             }
+            ++sheetsOfPage_;
+            places_.addSheet(pdf_.lastPage(), box_, placement, pieces_.size() - left.size(), taken.size());
             left = left.subspan(taken.size());
         } while (!left.empty());
         return true;
@@ -196,6 +218,10 @@ private:
     qint64 lineNumber_ = 0;
     std::deque<QString> lines_; ///< of the current page, reused for every page
     std::vector<QStringView> pieces_;
+    PdfPlaces places_{options_.outline};
+    PdfPageLabels labels_;
+    unsigned sheetsOfPage_ = 0;
+    int pageNumber_ = 0; ///< of the current page
 };
 
 template <typename Text>

@@ -1,7 +1,9 @@
 #pragma once
 
+#include "PdfDetails.h"
 #include "PdfGeometry.h"
 #include "PdfNotes.h"
+#include "ReportOutline.h"
 
 #include <QLatin1StringView>
 #include <QStringList>
@@ -22,6 +24,8 @@ struct PdfOptions
     PdfPageSetup page;
     std::vector<qint64> pageStarts;         ///< where its pages begin, for `reportPages`
     std::optional<QStringList> fontFolders; ///< where the preferred faces are looked for; nothing for the system's
+    const PdfDetails *details = nullptr;    ///< null for a PDF that has its pages alone
+    std::vector<OutlineEntry> outline;      ///< for `details`, in the order of their places
     std::function<bool(qint64, qint64)> progress; ///< receives the pages done and all pages; false stops. May be empty
 };
 

@@ -1,8 +1,10 @@
 #include "PdfFont.h"
 
 #include "CharacterCells.h"
+#include "CompressedFaces.h"
 
 #include <QByteArray>
+#include <QScopeGuard>
 
 #include <hpdf_font.h>
 #include <hpdf_fontdef.h>
@@ -11,6 +13,7 @@
 
 #include <algorithm>
 #include <map>
+#include <numeric>
 #include <utility>
 
 namespace kareport
@@ -21,6 +24,8 @@ namespace
 
 /// Entries of one block of a text map.
 constexpr std::size_t longestBlock = 100;
+/// Bytes of each piece that a stream in memory is made of.
+constexpr HPDF_UINT pieceSize = 16 * 1024;
 
 HPDF_FontAttr attributesOf(HPDF_Font font)
 {
@@ -33,6 +38,24 @@ bool rewrite(HPDF_Dict stream, QByteArrayView content)
     HPDF_MemStream_FreeData(stream->stream);
     return HPDF_Stream_Write(stream->stream, reinterpret_cast<const HPDF_BYTE *>(content.data()),
                              static_cast<HPDF_UINT>(content.size())) == HPDF_OK;
+}
+
+/// What has been put into a stream.
+QByteArray contentOf(HPDF_Stream stream)
+{
+    QByteArray content;
+    for (HPDF_UINT i = 0; i < HPDF_MemStream_GetBufCount(stream); ++i) {
+        HPDF_UINT size = 0;
+        const HPDF_BYTE *piece = HPDF_MemStream_GetBufPtr(stream, i, &size);
+        content.append(reinterpret_cast<const char *>(piece), size);
+    }
+    return content;
+}
+
+/// Says of a stream that is compressed already what the library says of those that it compresses.
+HPDF_STATUS sayCompressed(HPDF_Dict /*stream*/, HPDF_Stream file)
+{
+    return HPDF_Stream_WriteStr(file, "/Filter [ /FlateDecode ]\n");
 }
 
 QByteArray codeText(char16_t code)
@@ -112,25 +135,65 @@ bool PdfFont::describeCharacters()
     return writeWidths(shown) && writeGlyphs(shown) && writeTextMap(shown);
 }
 
+bool PdfFont::compressFace()
+{
+    // The library would make the face when it writes the font, and compress it then.
+    if (font_->before_write_fn(font_) != HPDF_OK) {
+        return false;
+    }
+    auto *const face = static_cast<HPDF_Dict>(
+        HPDF_Dict_GetItem(attributesOf(font_)->fontdef->descriptor, "FontFile2", HPDF_OCLASS_DICT));
+    if (face == nullptr || face->filter != HPDF_STREAM_FILTER_FLATE_DECODE) {
+        return face != nullptr;
+    }
+    const QByteArray content = contentOf(face->stream);
+    CompressedFaces &kept = CompressedFaces::ofProcess();
+    QByteArray compressed = kept.find(content);
+    if (compressed.isEmpty()) {
+        // By the library itself: its bytes are those that a document without anything kept has.
+        auto *const stream = HPDF_MemStream_New(font_->mmgr, pieceSize);
+        if (stream == nullptr) {
+            return false;
+        }
+        const auto freed = qScopeGuard([stream] { HPDF_Stream_Free(stream); });
+        if (HPDF_Stream_WriteToStream(face->stream, stream, face->filter, nullptr) != HPDF_OK) {
+            return false;
+        }
+        compressed = contentOf(stream);
+        kept.keep(content, compressed);
+    }
+    face->filter = HPDF_STREAM_FILTER_NONE;
+    face->write_fn = &sayCompressed;
+    return rewrite(face, compressed);
+}
+
 bool PdfFont::writeWidths(const std::vector<char16_t> &shown)
 {
     // The library lists the widths of all characters of the face one by one: 200 KB for a CJK face.
-    auto *const font = attributesOf(font_)->descendant_font;
     std::map<int, int> counts;
     for (const char16_t character : shown) {
         ++counts[advanceOf(character)];
     }
     const auto usual =
         std::max_element(counts.begin(), counts.end(), [](auto &a, auto &b) { return a.second < b.second; });
-    if (usual == counts.end()) {
-        return true;
+    if (usual != counts.end()) {
+        return writeWidths(shown, usual->first);
     }
+    // Nothing is shown in the face: what the library lists stays, but for its last character.
+    std::vector<char16_t> all(planeSize - 1);
+    std::iota(all.begin(), all.end(), u'\0');
+    return writeWidths(all, attributesOf(font_)->fontdef->missing_width);
+}
+
+bool PdfFont::writeWidths(const std::vector<char16_t> &characters, int usual)
+{
+    auto *const font = attributesOf(font_)->descendant_font;
     auto *const widths = HPDF_Array_New(font_->mmgr);
     bool isDone = widths != nullptr;
     HPDF_Array run = nullptr;
     int next = -1; // the character that would continue the run
-    for (const char16_t character : shown) {
-        if (!isDone || advanceOf(character) == usual->first) {
+    for (const char16_t character : characters) {
+        if (!isDone || advanceOf(character) == usual) {
             continue;
         }
         if (character != next) {
@@ -141,8 +204,7 @@ bool PdfFont::writeWidths(const std::vector<char16_t> &shown)
         isDone = isDone && HPDF_Array_AddNumber(run, advanceOf(character)) == HPDF_OK;
         next = character + 1;
     }
-    return isDone && HPDF_Dict_AddNumber(font, "DW", usual->first) == HPDF_OK &&
-           HPDF_Dict_Add(font, "W", widths) == HPDF_OK;
+    return isDone && HPDF_Dict_AddNumber(font, "DW", usual) == HPDF_OK && HPDF_Dict_Add(font, "W", widths) == HPDF_OK;
 }
 
 bool PdfFont::writeGlyphs(const std::vector<char16_t> &shown)

@@ -39,10 +39,15 @@ public:
     /// Describes the characters that are shown, and only those: their widths, their glyphs, and what a reader copies of
     /// them. To be called after the last page. @return false after an error
     bool describeCharacters();
+    /// Compresses the face, or takes what an earlier PDF's became. To be called after `describeCharacters`, for the faces of
+    /// a document in the order in which they were embedded: it gives the face its place in the file. @return false after
+    /// an error
+    bool compressFace();
 
 private:
     unsigned glyphOf(char16_t character) const;
     bool writeWidths(const std::vector<char16_t> &shown);
+    bool writeWidths(const std::vector<char16_t> &characters, int usual);
     bool writeGlyphs(const std::vector<char16_t> &shown);
     bool writeTextMap(const std::vector<char16_t> &shown);
 

@@ -3,6 +3,7 @@
 #include "CharacterCells.h"
 #include "PdfLineWriter.h"
 
+#include <hpdf_objects.h>
 #include <hpdf_pages.h>
 #include <hpdf_streams.h>
 
@@ -117,8 +118,18 @@ bool PdfTypesetter::addPage(const PdfPageBox &box, const LinePlacement &placemen
 
 bool PdfTypesetter::finish()
 {
-    return std::all_of(fonts_.begin(), fonts_.end(),
-                       [](PdfFont &font) { return !font.isEmbedded() || font.describeCharacters(); });
+    std::vector<PdfFont *> embedded;
+    for (PdfFont &font : fonts_) {
+        if (font.isEmbedded()) {
+            embedded.push_back(&font);
+        }
+    }
+    // The objects of a document are numbered in their order.
+    std::sort(embedded.begin(), embedded.end(), [](const PdfFont *first, const PdfFont *second) {
+        return first->handle()->header.obj_id < second->handle()->header.obj_id;
+    });
+    return std::all_of(embedded.begin(), embedded.end(),
+                       [](PdfFont *font) { return font->describeCharacters() && font->compressFace(); });
 }
 
 bool PdfTypesetter::isPlain(QStringView line) const

@@ -4,6 +4,7 @@
 #include "DeskFixture.h"
 #include "FileSizeLimit.h"
 #include "JobFolder.h"
+#include "PdfReadBack.h"
 #include "SaveDialog.h"
 #include "UReportWindowDlg.h"
 
@@ -200,6 +201,38 @@ TEST(SaveAs, APdfIsAnExport)
         EXPECT_EQ(report->GetTitle(), title);
         EXPECT_TRUE(report->IsModified()) << "the report itself is not saved";
         EXPECT_EQ(UApplication::Get()->GetRecentFileList(), recent);
+    }
+}
+
+TEST(SaveAs, APdfMayHaveAnOutline)
+{
+    struct Row
+    {
+        const char *kind; ///< that is chosen
+        const char *title;
+        const char *outline;
+        const char *reason;
+    };
+    const Row rows[] = {
+        {nullptr, "", "", "a name alone: the pages alone"},
+        {"PDF (*.pdf)", "", "", "the plain kind"},
+        {"PDF with outline and page numbers (*.pdf)", "R", "Points 1\n", "the other one"},
+    };
+    for (const Row &row : rows) {
+        const JobFolder folder;
+        SavingDesk desk;
+        UReportDoc *report = newReport();
+        report->AnnounceEntry(1, QStringLiteral("Points"));
+        report->WriteLine(QStringLiteral("1 5.000"), 0, 1, 0);
+        desk.kind = QLatin1String(row.kind);
+        desk.typed = {folder.path("out.pdf")};
+        report->DoSave(QString(), true);
+        const PdfReadBack pdf(folder.bytesOf("out.pdf"));
+        EXPECT_EQ(pdf.info("Title"), QLatin1String(row.title)) << row.reason;
+        EXPECT_EQ(pdf.info("Creator"), row.kind != nullptr && *row.outline != 0 ? QStringLiteral("TALVEN") : QString())
+            << row.reason;
+        EXPECT_EQ(pdf.outline(), QString::fromUtf8(row.outline)) << row.reason;
+        EXPECT_TRUE(report->IsModified()) << row.reason;
     }
 }
 

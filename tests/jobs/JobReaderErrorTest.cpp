@@ -65,6 +65,28 @@ TEST(JobReaderError, OfTheJobItself)
     expectErrors(rows);
 }
 
+TEST(JobReaderError, OfPdfs)
+{
+    constexpr Row rows[] = {
+        {R"({"report": [], "pdf": @true})", "an object was expected", "wrong type"},
+        {R"({"report": [], "pdf": @null})", "an object was expected", "null is no object"},
+        {R"({"report": [], "pdf": {@"autor": "A"}})", "did you mean \"author\"", "an unknown key, with the nearest"},
+        {R"({"report": [], "pdf": {"title": @5}})", "a text was expected", "wrong type"},
+        {R"({"report": [], "pdf": {"author": @null}})", "a text was expected", "wrong type"},
+        {R"({"report": [], "pdf": {"creator": @[]}})", "a text was expected", "wrong type"},
+        {R"({"report": [], "pdf": {"language": @5}})", "a text was expected", "wrong type"},
+        {R"({"report": [], "pdf": {"language": @"German language"}})", "de or en-GB", "no tag"},
+        {R"({"report": [], "pdf": {"language": @""}})", "de or en-GB", "an empty text"},
+        {R"({"report": [], "pdf": {"language": @"de_DE"}})", "de or en-GB", "a locale of a system"},
+        {R"({"report": [], "pdf": {"language": @"de-"}})", "de or en-GB", "an empty part"},
+        {R"({"report": [], "pdf": {"language": @"de\n"}})", "de or en-GB", "a line end"},
+        {R"({"report": [], "pdf": {"language": @"d\u00e9"}})", "de or en-GB", "a letter that is not ASCII"},
+        {R"({"report": [], "pdf": {"outline": @"yes"}})", "true or false was expected", "wrong type"},
+        {R"({"report": [], "pdf": {"pageLabels": @1}})", "true or false was expected", "wrong type"},
+    };
+    expectErrors(rows);
+}
+
 TEST(JobReaderError, OfThePage)
 {
     constexpr Row rows[] = {

@@ -391,4 +391,27 @@ TEST(CommandLineBatch, ProgressTellsTheJobs)
     EXPECT_TRUE(run.err.endsWith('\r')) << "the line is taken off the screen";
 }
 
+TEST(CommandLineBatch, ALaterPdfHasTheBytesOfAProcessOfItsOwn)
+{
+    const CommandLineFolder folder;
+    const char *const names[] = {"a", "b", "c"};
+    for (const char *name : names) {
+        // The second one needs other faces, the third one those of the first.
+        const char *line = *name == 'b' ? "\xE6\xB8\xAC \xE2\x88\x9E" : "P1 100.25";
+        folder.put((QByteArray(name) + ".json").constData(), lineJob(line, (QByteArray(name) + ".pdf").constData()));
+    }
+    QByteArrayList alone;
+    for (const char *name : names) {
+        ASSERT_EQ(
+            folder.run(QStringList{QStringLiteral("render"), QLatin1StringView(name) + QStringLiteral(".json")}).status,
+            0);
+        alone.append(folder.bytesOf((QByteArray(name) + ".pdf").constData()));
+    }
+    ASSERT_EQ(folder.run("render a.json b.json c.json").status, 0);
+    for (qsizetype i = 0; i < alone.size(); ++i) {
+        EXPECT_TRUE(alone[i].startsWith("%PDF-"));
+        EXPECT_TRUE(folder.bytesOf((QByteArray(names[i]) + ".pdf").constData()) == alone[i]) << names[i];
+    }
+}
+
 } // namespace

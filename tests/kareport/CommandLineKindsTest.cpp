@@ -58,6 +58,35 @@ TEST(CommandLineKinds, RichTextDoesNotHangOnAnotherOutput)
     EXPECT_TRUE(folder.bytesOf("i.rtf").contains("\\b0"));
 }
 
+TEST(CommandLineKinds, APdfSaysWhatTheJobAsks)
+{
+    const CommandLineFolder folder;
+    folder.put("p.json", R"({"title": "Setting out", "now": "2024-03-05T14:07:00",
+        "page": {"linesPerPage": 60, "charsPerRow": 80},
+        "report": [{"heading": "A"}, {"line": "a"}, {"heading": "B"}, {"newPage": -1}, {"line": "b"}]})");
+    ASSERT_EQ(folder.run("render p.json -o plain.pdf").status, 0);
+    const ProgramRun run =
+        folder.run("render p.json -o a.pdf -o b.rep -o c.pdf --set pdf.author=Ärger --set pdf.language=de");
+    ASSERT_EQ(run.status, 0) << run.all().constData();
+    EXPECT_EQ(run.err.toStdString(), "");
+    EXPECT_EQ(folder.bytesOf("a.pdf"), folder.bytesOf("c.pdf"));
+    const PdfReadBack pdf(folder.bytesOf("a.pdf"));
+    EXPECT_EQ(pdf.info("Title"), QStringLiteral("Setting out"));
+    EXPECT_EQ(pdf.info("Author"), QStringLiteral("Ärger"));
+    EXPECT_EQ(pdf.info("Creator"), QStringLiteral("TALVEN"));
+    EXPECT_EQ(pdf.outline(), QStringLiteral("A 1\nB 2\n"));
+    EXPECT_EQ(pdf.labels(), (QStringList{QStringLiteral("1"), QStringLiteral("2")}));
+    EXPECT_TRUE(pdf.objects().contains("/CreationDate (D:20240305140700)"));
+    const PdfReadBack plain(folder.bytesOf("plain.pdf"));
+    EXPECT_EQ(plain.info("Title"), QString());
+    EXPECT_EQ(plain.outline(), QString());
+    EXPECT_EQ(plain.pages(), pdf.pages());
+    const ProgramRun wrong = folder.run("render p.json -o d.pdf --set pdf.language=d_d");
+    EXPECT_EQ(wrong.status, 2);
+    EXPECT_TRUE(wrong.err.startsWith("--set pdf.language=d_d: error: ")) << wrong.err.constData();
+    EXPECT_FALSE(folder.names().contains(QStringLiteral("d.pdf")));
+}
+
 TEST(CommandLineKinds, ACharacterThatNoFontHasIsSaid)
 {
     const CommandLineFolder folder;

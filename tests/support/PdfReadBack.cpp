@@ -1,10 +1,31 @@
 #include "PdfReadBack.h"
 
 #include <QFile>
+#include <QJsonArray>
+#include <QJsonDocument>
 #include <QProcess>
 #include <QRegularExpression>
 
 #include <algorithm>
+
+namespace
+{
+
+/// Adds entries of an outline, as qpdf gives them, to a text.
+void addEntries(QString &text, const QJsonArray &entries, int level)
+{
+    for (const QJsonValue &value : entries) {
+        const QJsonObject entry = value.toObject();
+        const QJsonArray kids = entry.value(QStringLiteral("kids")).toArray();
+        const bool isOpen = kids.isEmpty() || entry.value(QStringLiteral("open")).toBool();
+        text += QString(2 * level, u' ') + entry.value(QStringLiteral("title")).toString() + u' ' +
+                QString::number(entry.value(QStringLiteral("destpageposfrom1")).toInt()) +
+                (isOpen ? QStringLiteral("\n") : QStringLiteral("…\n"));
+        addEntries(text, kids, level + 1);
+    }
+}
+
+} // namespace
 
 PdfReadBack::PdfReadBack(const QByteArray &bytes, const char *remark)
     : path_(folder_.filePath(QStringLiteral("a.pdf"))), remark_(remark)
@@ -140,6 +161,51 @@ QString PdfReadBack::info(const char *entry) const
         }
     }
     return {};
+}
+
+QJsonObject PdfReadBack::json(const char *key) const
+{
+    const QByteArray said =
+        run("qpdf", {QStringLiteral("--json=1"), QStringLiteral("--json-key=") + QLatin1StringView(key), path_});
+    return QJsonDocument::fromJson(said).object();
+}
+
+QString PdfReadBack::outline() const
+{
+    QString text;
+    addEntries(text, json("outlines").value(QStringLiteral("outlines")).toArray(), 0);
+    return text;
+}
+
+QStringList PdfReadBack::outlineTexts() const
+{
+    static const QRegularExpression item(QStringLiteral("<item page=\"\\d+\">(.*?)</item>"));
+    const QString said = QString::fromUtf8(run("pdftohtml", {QStringLiteral("-xml"), QStringLiteral("-i"),
+                                                             QStringLiteral("-stdout"), QStringLiteral("-q"), path_}));
+    QStringList texts;
+    for (auto match = item.globalMatch(said); match.hasNext();) {
+        texts.append(match.next().captured(1));
+    }
+    return texts;
+}
+
+QStringList PdfReadBack::labels() const
+{
+    QStringList labels;
+    const QJsonArray ranges = json("pagelabels").value(QStringLiteral("pagelabels")).toArray();
+    const int pages = pageCount();
+    for (qsizetype i = 0; i < ranges.size(); ++i) {
+        const QJsonObject range = ranges[i].toObject();
+        const QJsonObject label = range.value(QStringLiteral("label")).toObject();
+        EXPECT_EQ(label.value(QStringLiteral("/S")).toString(), QStringLiteral("/D"));
+        const int first = range.value(QStringLiteral("index")).toInt();
+        const int end = i + 1 < ranges.size() ? ranges[i + 1].toObject().value(QStringLiteral("index")).toInt() : pages;
+        const int number = label.value(QStringLiteral("/St")).toInt(1);
+        for (int page = first; page < end; ++page) {
+            labels.append(label.value(QStringLiteral("/P")).toString() + QString::number(number + page - first));
+        }
+    }
+    return labels;
 }
 
 Ink inkIn(const QImage &image, const QRect &area)

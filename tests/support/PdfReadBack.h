@@ -2,6 +2,7 @@
 
 #include <QByteArray>
 #include <QImage>
+#include <QJsonObject>
 #include <QRect>
 #include <QString>
 #include <QStringList>
@@ -49,6 +50,16 @@ public:
     /// All that is written on all pages, in the order of writing, without blanks and line ends.
     QString characters() const;
 
+    /// What a reader says of the document, such as its "Title"; empty when it says nothing.
+    QString info(const char *entry) const;
+    /// The outline with an entry a line, two blanks before it for each that it belongs to, and after it the number of its page.
+    /// An entry whose own are not shown at first ends with "…".
+    QString outline() const;
+    /// The texts of the outline, in their order, as a viewer reads them.
+    QStringList outlineTexts() const;
+    /// The names of all pages, as viewers show them.
+    QStringList labels() const;
+
     int pageCount() const { return info("Pages").toInt(); }
     /// Of the first page, as "612 x 792 pts (letter)".
     QString pageSize() const { return info("Page size"); }
@@ -71,8 +82,7 @@ private:
     QStringList textOfPages(const QStringList &options) const;
 
     QByteArray run(const char *program, const QStringList &arguments) const;
-
-    QString info(const char *entry) const;
+    QJsonObject json(const char *key) const;
 
     QTemporaryDir folder_;
     QString path_;
