@@ -74,7 +74,7 @@ void pdfOfOnePage(benchmark::State &state)
         }
     }
 }
-BENCHMARK(pdfOfOnePage)->ArgName("kept")->Arg(0)->Arg(1)->Unit(benchmark::kMillisecond);
+BENCHMARK(pdfOfOnePage)->Arg(0)->Arg(1)->Unit(benchmark::kMillisecond);
 
 void saveReportFile(benchmark::State &state)
 {

@@ -1,4 +1,6 @@
 """Pages of text to a PDF with an embedded face."""
+import json
+
 from measure import Command, in_turn
 from work import Comparison, Limit, make, ratio, share
 
@@ -20,6 +22,12 @@ for page in range(0, len(lines), 72):
     pdf.showPage()
 pdf.save()
 """
+PART = 10  # pages, each with an entry of the outline
+OUTLINE = REPORTLAB.replace("    pdf.showPage()", f"""
+    if page % {LINES * PART} == 0:
+        pdf.bookmarkPage(str(page))
+        pdf.addOutlineEntry(f'Part {{page // {LINES * PART} + 1}}', str(page), 0)
+    pdf.showPage()""").replace("pdf.save()", "pdf.setTitle('Pages')\npdf.save()")
 # The face is put into the file, as the others do: by itself ps2pdf leaves the standard ones out.
 GHOSTSCRIPT = "-dPDFSETTINGS=/prepress -dEmbedAllFonts=true"
 ENSCRIPT = (f"enscript -q -B -M A4 -f Courier8 -L {LINES} -p pages.ps pages.txt && "
@@ -40,8 +48,36 @@ def make_files(folder, pages):
             text.write(line + "\n")
 
 
+def make_outlined(folder, pages):
+    steps = []
+    with open(f"{folder}/pages.txt", "w") as text:
+        for number, line in enumerate(lines(LINES * pages)):
+            if number % (LINES * PART) == 0:
+                steps.append({"heading": f"Part {number // (LINES * PART) + 1}"})
+            steps.append({"line": line})
+            text.write(line + "\n")
+    with open(f"{folder}/pages.json", "w") as file:
+        json.dump({"title": "Pages", "now": "2024-03-05T14:07:00", "header": False, "pdf": {}, "report": steps,
+                   "page": {"linesPerPage": LINES, "charsPerRow": 80}, "output": ["kareport.pdf"]}, file)
+
+
+def with_outline(surroundings):
+    pages = surroundings.size(1000, 20)
+    with surroundings.folder() as folder:
+        make(make_outlined, folder, pages)
+        results = in_turn([
+            Command("kareport", [surroundings.kareport, "render", "--quiet", "pages.json"], ours=True),
+            Command("ReportLab", ["/usr/bin/python3", "-c", OUTLINE, "pages.txt", "reportlab.pdf"]),
+        ], folder, surroundings.runs)
+    return Comparison(
+        f"pdf-outline-{pages}", f"{pages:,} pages to a PDF with an outline",
+        f"{pages:,} pages of {LINES} lines of 80 characters to a PDF with a title and an outline that has an entry for every "
+        f"{PART} pages. kareport reads a job with a step for each line, ReportLab the lines; only kareport numbers the pages.",
+        results, [Limit("time, of the other", ratio(results, "kareport"), 1.0)])
+
+
 def run(surroundings):
-    comparisons = []
+    comparisons = [with_outline(surroundings)]
     for pages, runs in ((surroundings.size(1000, 20), surroundings.runs),
                         (surroundings.size(10_000, 200), min(surroundings.runs, 3))):
         with surroundings.folder() as folder:

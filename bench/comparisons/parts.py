@@ -22,6 +22,8 @@ PARTS = [
     ("formatField/9", None, "a station in its column", 100e-9),
     ("formatField/4", None, "a bearing in its column", 1e-6),
     ("pdfPages/100", "pdfPages/1000", "100 PDF pages of 72 × 80", 100 / 650),
+    ("pdfOfOnePage/1", None, "a PDF of one page, with the face of an earlier one", 0.004),
+    ("pdfOfOnePage/0", None, "the same with characters that no earlier one had", None),
     ("saveReportFile/120000", "saveReportFile/1200000", "a report file of 10 MB saved", 0.1),
     ("loadReportFile/120000", "loadReportFile/1200000", "a report file of 10 MB loaded", 0.1),
     ("richTextImage/300000", None, "the rich-text image of 300,000 lines", 0.15),
