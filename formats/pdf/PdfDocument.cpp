@@ -145,6 +145,7 @@ bool PdfDocument::describe(const PdfDetails &details)
         HPDF_Dict_Add(document_->info, "CreationDate", HPDF_String_New(document_->mmgr, time.constData(), nullptr));
     }
     if (!details.language.isEmpty()) {
+        document_->pdf_version = std::max(document_->pdf_version, HPDF_VER_14); // the first one that has it
         HPDF_Dict_Add(document_->catalog, "Lang",
                       HPDF_String_New(document_->mmgr, details.language.toLatin1().constData(), nullptr));
     }

@@ -1,9 +1,7 @@
 #include "PdfFaces.h"
 #include "FixedPitchFont.h"
 
-#include <QDir>
 #include <QFile>
-#include <QFileInfo>
 
 #include <fontconfig/fontconfig.h>
 
@@ -132,26 +130,6 @@ QStringList systemFontFolders()
         FcStrListDone(list);
     }
     return folders;
-}
-
-std::optional<PdfFace> preferredPdfFace(const QStringList &fontFolders)
-{
-    struct Row
-    {
-        QStringView name;
-        bool isCollection;
-    };
-    static constexpr Row rows[] = {{u"MSGOTHIC.TTC", true}, {u"lucon.TTF", false}};
-    for (const Row &row : rows) {
-        for (const QString &folder : fontFolders) {
-            // A name filter ignores case, as the platform does that these files come from.
-            const QStringList files = QDir(folder).entryList({row.name.toString()}, QDir::Files, QDir::Name);
-            if (!files.isEmpty()) {
-                return PdfFace(QDir(folder).filePath(files.first()), 0, row.isCollection);
-            }
-        }
-    }
-    return std::nullopt;
 }
 
 std::vector<PdfFace> fixedPitchPdfFaces()

@@ -3,6 +3,9 @@
 
 #include <gtest/gtest.h>
 
+#include <chrono>
+#include <filesystem>
+
 namespace
 {
 
@@ -97,6 +100,34 @@ TEST(PdfFaces, ThePreferredOneIsLookedForByName)
             EXPECT_EQ(face->index(), 0U) << row.reason;
         }
     }
+}
+
+TEST(PdfFaces, AFontThatComesOrGoesIsSeen)
+{
+    FontFolder folder;
+    const auto makeOld = [&folder] {
+        // What has just changed is looked into each time.
+        using namespace std::chrono_literals;
+        std::filesystem::last_write_time(folder.path().toStdString(),
+                                         std::filesystem::file_time_type::clock::now() - 1h);
+    };
+    makeOld();
+    EXPECT_FALSE(preferredPdfFace({folder.path()}));
+    folder.with(QStringLiteral("lucon.TTF"), dejaVuFile());
+    ASSERT_TRUE(preferredPdfFace({folder.path()}));
+    EXPECT_TRUE(preferredPdfFace({folder.path()})->covers(U'A'));
+    makeOld();
+    EXPECT_TRUE(preferredPdfFace({folder.path()})->covers(U'A'));
+    // A file that is written over leaves its folder as it was.
+    const QString file = QDir(folder.path()).filePath(QStringLiteral("lucon.TTF"));
+    QFile content(file);
+    ASSERT_TRUE(content.open(QIODevice::WriteOnly | QIODevice::Truncate));
+    content.write("no font");
+    content.close();
+    ASSERT_TRUE(preferredPdfFace({folder.path()}));
+    EXPECT_FALSE(preferredPdfFace({folder.path()})->covers(U'A'));
+    ASSERT_TRUE(QFile::remove(file));
+    EXPECT_FALSE(preferredPdfFace({folder.path()}));
 }
 
 TEST(PdfFaces, TheSystemsOwnAreInTheOrderOfPreference)
