@@ -1977,6 +1977,11 @@
         <translation>„%1“ konnte nicht geschrieben werden: %2</translation>
     </message>
     <message>
+        <location filename="../jobs/JobPdfReader.cpp"/>
+        <source>a language such as de or en-GB was expected</source>
+        <translation>eine Sprache wie de oder en-GB wurde erwartet</translation>
+    </message>
+    <message>
         <location filename="../jobs/JobReader.cpp"/>
         <source>a list of four margins (left, top, right, bottom) was expected</source>
         <translation>eine Liste von vier Seitenrändern (links, oben, rechts, unten) wurde erwartet</translation>
@@ -1985,11 +1990,6 @@
         <location filename="../jobs/JobReader.cpp"/>
         <source>a character code or a text of one character was expected</source>
         <translation>ein Zeichencode oder ein Text aus einem Zeichen wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>a language such as de or en-GB was expected</source>
-        <translation>eine Sprache wie de oder en-GB wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/JobReader.cpp"/>

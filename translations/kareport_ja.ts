@@ -1977,6 +1977,11 @@
         <translation>「%1」に書き込めませんでした: %2</translation>
     </message>
     <message>
+        <location filename="../jobs/JobPdfReader.cpp"/>
+        <source>a language such as de or en-GB was expected</source>
+        <translation>de や en-GB のような言語が必要です</translation>
+    </message>
+    <message>
         <location filename="../jobs/JobReader.cpp"/>
         <source>a list of four margins (left, top, right, bottom) was expected</source>
         <translation>4 つの余白 (左、上、右、下) のリストが必要です</translation>
@@ -1985,11 +1990,6 @@
         <location filename="../jobs/JobReader.cpp"/>
         <source>a character code or a text of one character was expected</source>
         <translation>文字コードまたは 1 文字のテキストが必要です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobReader.cpp"/>
-        <source>a language such as de or en-GB was expected</source>
-        <translation>de や en-GB のような言語が必要です</translation>
     </message>
     <message>
         <location filename="../jobs/JobReader.cpp"/>

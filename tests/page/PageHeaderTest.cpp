@@ -108,4 +108,30 @@ TEST(PageHeader, WithItsPageNumberTheLineEndsSoManyCharactersBeforeTheRow)
     }
 }
 
+TEST(PageHeader, SaysTheNumberOfItsPage)
+{
+    const QString front =
+        kareport::pageHeaderLine(QStringLiteral("A"), QStringLiteral("T 7"), afternoon, pageLabel, 80);
+    struct Row
+    {
+        QString line;
+        std::optional<int> number;
+        const char *reason;
+    };
+    const Row rows[] = {
+        {front + QStringLiteral("  1"), 1, "padded"},
+        {front + QStringLiteral("123"), 123, "three digits"},
+        {front + QStringLiteral("12345"), 12345, "more than three"},
+        {front + QStringLiteral("  7 \r"), 7, "blanks and a line end after it"},
+        {front + QStringLiteral("123456789"), 123456789, "nine digits"},
+        {front + QStringLiteral("1234567890"), std::nullopt, "too many"},
+        {front, std::nullopt, "none"},
+        {QStringLiteral("12.5  7"), std::nullopt, "a line that is no header"},
+        {QString(), std::nullopt, "an empty line"},
+    };
+    for (const Row &row : rows) {
+        EXPECT_EQ(kareport::pageNumberOf(row.line), row.number) << row.reason;
+    }
+}
+
 } // namespace
