@@ -2,6 +2,7 @@
 
 #include "LinkTarget.h"
 
+#include <QDir>
 #include <QDirIterator>
 #include <QFile>
 #include <QFileInfo>
@@ -59,6 +60,27 @@ bool ignoresCase(const QString &folder, const QString &identity)
     return answer != known.constEnd() ? *answer : *known.insert(identity, ignoresCase(folder));
 }
 
+/// The identity of a file in a folder that is not there yet: what is missing is told apart by its name, below the last
+/// folder that is there. The folders may be made before the file is: a ".." in the name then leads back out of them.
+QString identityInMissingFolder(const QString &path)
+{
+    const QString clean = QDir::cleanPath(QFileInfo(path).absoluteFilePath());
+    if (const auto status = statusOf(clean)) {
+        return S_ISREG(status->st_mode) ? identityOf(*status) : QString();
+    }
+    QString folder = QFileInfo(clean).path();
+    while (!statusOf(folder) && folder != QFileInfo(folder).path()) {
+        folder = QFileInfo(folder).path();
+    }
+    const auto status = statusOf(folder);
+    if (!status) {
+        return clean;
+    }
+    const QString identity = identityOf(*status);
+    const QString below = QDir(folder).relativeFilePath(clean);
+    return identity + u'/' + (ignoresCase(folder, identity) ? below.toCaseFolded() : below);
+}
+
 } // namespace
 
 QString fileIdentity(const QString &path)
@@ -70,7 +92,7 @@ QString fileIdentity(const QString &path)
     const QFileInfo info(target.isEmpty() ? path : target);
     const auto folder = statusOf(info.path());
     if (!folder) {
-        return info.filePath(); // nothing can be written there, as will show
+        return identityInMissingFolder(info.filePath());
     }
     const QString identity = identityOf(*folder);
     return identity + u'/' + (ignoresCase(info.path(), identity) ? info.fileName().toCaseFolded() : info.fileName());

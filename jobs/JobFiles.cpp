@@ -71,21 +71,28 @@ std::optional<OutputClash> outputClash(const Job &job, const std::vector<Output>
     return std::nullopt;
 }
 
-bool isUpToDate(const Job &job, const QString &path)
+QStringList sourceFiles(const Job &job, const QString &path)
 {
     QStringList sources;
     if (!path.isEmpty()) {
-        sources.append(path);
+        sources.append(QFileInfo(path).absoluteFilePath());
     }
     if (job.reportTemplate) {
         sources.append(job.reportTemplate->file);
     }
     for (const Job::DataSet &set : job.data) {
-        if (!set.source->isAllInFiles()) {
-            return false;
-        }
         sources += set.source->files();
     }
+    return sources;
+}
+
+bool isUpToDate(const Job &job, const QString &path)
+{
+    if (!std::all_of(job.data.begin(), job.data.end(),
+                     [](const Job::DataSet &set) { return set.source->isAllInFiles(); })) {
+        return false;
+    }
+    const QStringList sources = sourceFiles(job, path);
     return !job.outputs.empty() && std::all_of(job.outputs.begin(), job.outputs.end(), [&](const Output &output) {
         const QFileInfo written(output.file);
         return !output.isStandardOutput() && written.isFile() &&

@@ -2,6 +2,7 @@
 
 #include "JobFolder.h"
 
+#include <QElapsedTimer>
 #include <QTest>
 
 #include <gtest/gtest.h>
@@ -88,6 +89,48 @@ TEST(FileWatch, AFileThatGoesAndComesBackIsToldWhenItIsBack)
     EXPECT_EQ(t.settled(), QStringList()) << "a file that has gone is nothing to load";
     t.folder.put("a", "back again");
     EXPECT_TRUE(t.waitFor(1));
+}
+
+TEST(FileWatch, AFileThatIsNotThereYetIsToldWhenItComes)
+{
+    Watched t;
+    for (const char *name : {"late", "new/late", "new/deep/late"}) {
+        t.told.clear();
+        t.watch.watch(t.folder.path(name));
+        EXPECT_EQ(t.settled(), QStringList()) << name;
+        ASSERT_TRUE(QDir(t.folder.path()).mkpath(QFileInfo(QString::fromUtf8(name)).path()));
+        EXPECT_EQ(t.settled(), QStringList()) << name << ": its folder alone";
+        t.folder.put(name, "1");
+        EXPECT_TRUE(t.waitFor(1)) << name;
+    }
+}
+
+TEST(FileWatch, ALinkThatLeadsElsewhereIsAChange)
+{
+    Watched t;
+    t.folder.put("b", "1");
+    QDir(t.folder.path()).mkdir(QStringLiteral("links"));
+    const QString link = t.folder.path("links/l");
+    ASSERT_TRUE(QFile::link(t.folder.path("a"), link));
+    t.watch.forget(t.folder.path("a"));
+    t.watch.watch(link);
+    const QString other = t.folder.path("links/new");
+    ASSERT_TRUE(QFile::link(t.folder.path("b"), other));
+    ASSERT_EQ(std::rename(qPrintable(other), qPrintable(link)), 0);
+    EXPECT_TRUE(t.waitFor(1)) << "as long, and perhaps as old";
+}
+
+TEST(FileWatch, AFileThatNeverSettlesIsToldAllTheSame)
+{
+    Watched t;
+    QElapsedTimer clock;
+    clock.start();
+    int size = 1;
+    while (t.told.isEmpty() && clock.elapsed() < 30'000) {
+        t.folder.put("a", QByteArray(++size, 'x'));
+        QTest::qWait(50);
+    }
+    EXPECT_FALSE(t.told.isEmpty());
 }
 
 TEST(FileWatch, AChangeBetweenTheReadingAndTheWatchIsTold)
