@@ -14,6 +14,20 @@ install(TARGETS kareport kareport-desk RUNTIME DESTINATION ${CMAKE_INSTALL_BINDI
 install(FILES LICENSES.md CHANGELOG.md DESTINATION ${CMAKE_INSTALL_DOCDIR} COMPONENT programs)
 install(FILES examples/survey.xml DESTINATION ${CMAKE_INSTALL_DATADIR}/kareport/templates COMPONENT library)
 install(FILES docs/kareport.1 docs/kareport-desk.1 DESTINATION ${CMAKE_INSTALL_MANDIR}/man1 COMPONENT programs)
+# Where each shell looks for what completes a command, in the system's folders as well as in /usr/local. A package of Debian has a
+# folder of its own for zsh.
+set(completion ${PROJECT_BINARY_DIR}/completion)
+install(FILES ${completion}/kareport.bash RENAME kareport COMPONENT programs
+        DESTINATION ${CMAKE_INSTALL_DATADIR}/bash-completion/completions)
+install(FILES ${completion}/kareport.fish COMPONENT programs DESTINATION ${CMAKE_INSTALL_DATADIR}/fish/vendor_completions.d)
+install(CODE [[
+    set(ka_zsh_folder site-functions)
+    if(CMAKE_INSTALL_PREFIX MATCHES "(^|/)usr/?$")
+        set(ka_zsh_folder vendor-completions)
+    endif()
+]] COMPONENT programs)
+install(FILES ${completion}/kareport.zsh RENAME _kareport COMPONENT programs
+        DESTINATION "${CMAKE_INSTALL_DATADIR}/zsh/\${ka_zsh_folder}")
 install(FILES packaging/kareport-desk.desktop DESTINATION ${CMAKE_INSTALL_DATADIR}/applications COMPONENT programs)
 install(FILES packaging/kareport.svg DESTINATION ${CMAKE_INSTALL_DATADIR}/icons/hicolor/scalable/apps COMPONENT programs)
 install(FILES packaging/kareport.xml DESTINATION ${CMAKE_INSTALL_DATADIR}/mime/packages COMPONENT programs)

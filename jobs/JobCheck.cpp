@@ -70,6 +70,7 @@ void runJob(Job job, const JsonSource &source, bool isStrict, CheckedFile &check
     UReportDoc report(surroundingsOf(job));
     JobRunner runner(job, source, progress);
     runner.measure();
+    progress.expectPieces(readingsOf(job));
     NoDevice device;
     ReportTextWriter writer(device, LineEnds::PlainText);
     const auto error = runner.run(report, &writer);

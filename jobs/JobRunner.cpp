@@ -64,6 +64,14 @@ ReportSurroundings surroundingsOf(const Job &job)
     return surroundings;
 }
 
+std::size_t readingsOf(const Job &job)
+{
+    const auto count = std::count_if(job.steps.begin(), job.steps.end(), [](const Job::Step &step) {
+        return std::holds_alternative<Job::Block>(step.action) || std::holds_alternative<Job::Table>(step.action);
+    });
+    return static_cast<std::size_t>(count);
+}
+
 std::optional<InputError> JobRunner::run(UReportDoc &report, ReportTextWriter *stream)
 {
     DataRemarks remarks;

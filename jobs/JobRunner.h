@@ -23,6 +23,9 @@ namespace kareport
 /// gives it (SOURCE_DATE_EPOCH), else the host's.
 ReportSurroundings surroundingsOf(const Job &job);
 
+/// How often making the report of a job begins to read data.
+std::size_t readingsOf(const Job &job);
+
 /// Makes a report as a job describes it.
 class JobRunner
 {

@@ -19,3 +19,4 @@ scripts/check-binaries.sh --in "$unpacked"
 mapfile -t libraries < <(find "$unpacked" -type f -name '*.so.*')
 scripts/check-exports.py "$unpacked/usr/include/KaReport" "${libraries[@]}"
 scripts/check-headers.sh "$unpacked/usr/include/KaReport"
+tests/package/completion-test.sh "$unpacked/usr" vendor-completions

@@ -38,6 +38,7 @@ packages_test=(
     qt6-translations-l10n   # Qt's own texts in other languages
     parallel                # spreads a batch of jobs over processes and machines
     doxygen                 # says which member of a public header has no sentence
+    zsh fish                # shells in which the command line is completed
     pkg-config              # a program outside that asks it for our flags
 )
 packages_docs=(

@@ -119,7 +119,9 @@ ExitStatus CheckCommand::run(int &argc, char **argv) const
     TerminalProgress bar(progress);
     ExitStatus status = exitDone;
     QJsonArray all;
-    for (const QString &file : files) {
+    for (qsizetype i = 0; i < files.size(); ++i) {
+        const QString &file = files[i];
+        bar.beginShare(static_cast<std::size_t>(i), static_cast<std::size_t>(files.size()));
         std::optional<QString> wrongSet;
         const CheckedFile checked = checkFile(*this, file, jobs.contains(file), bar, wrongSet);
         if (wrongSet) {
@@ -136,10 +138,11 @@ ExitStatus CheckCommand::run(int &argc, char **argv) const
         }
         status = std::max(status, checked.hasErrors() ? exitInput : exitDone);
         const bool isNoted = notes && checked.isJob && !checked.isNotesFileNeeded;
-        if (isNoted && !writeNotesFile(checked.notes, notesFileOf(*this, file))) {
+        if (isNoted && !writeNotesFile(checked.notes, notesFileOf(*this, file), OutputFolders(parents))) {
             status = std::max(status, exitOutput);
         }
     }
+    bar.complete();
     if (json) {
         printJson(all);
     }

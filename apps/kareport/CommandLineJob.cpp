@@ -28,7 +28,8 @@ constexpr qint64 largeReport = qint64(100) << 20;
 
 } // namespace
 
-CommandLineJob::CommandLineJob(const RenderCommand &command, Expected<JsonSource> source) : command_(command)
+CommandLineJob::CommandLineJob(const RenderCommand &command, Expected<JsonSource> source)
+    : command_(command), folders_(command.parents)
 {
     if (const InputError *error = errorOf(source)) {
         fail(exitInput, error->message());
@@ -227,8 +228,9 @@ std::optional<ExitStatus> CommandLineJob::runIntoOutput(JobRunner &runner, URepo
     }
     progress.finish();
     // An interrupt after the report is made is too late to stop it.
-    return isMade ? sayWritten(output, {isEmpty && isReport ? std::nullopt : problem}, isEmpty, command_.quiet)
-                  : madeStatus(report, inputError);
+    return isMade
+               ? sayWritten(output, {isEmpty && isReport ? std::nullopt : problem}, isEmpty, command_.quiet, folders_)
+               : madeStatus(report, inputError);
 }
 
 ExitStatus CommandLineJob::run(Progress &progress)
@@ -240,8 +242,13 @@ ExitStatus CommandLineJob::run(Progress &progress)
     UReportDoc report(surroundingsOf(job_));
     JobRunner runner(job_, source_, progress);
     runner.stopWhen([this] { return isReaderGone(); });
-    if (const Output *output = streamedOutput(job_)) {
-        if (const auto status = runIntoOutput(runner, report, *output, progress)) {
+    const Output *streamed = streamedOutput(job_);
+    const auto files = std::count_if(job_.outputs.begin(), job_.outputs.end(),
+                                     [](const Output &output) { return !output.isStandardOutput(); });
+    progress.expectPieces(readingsOf(job_) + (streamed != nullptr ? 0 : static_cast<std::size_t>(files)));
+    if (streamed != nullptr) {
+        folders_.prepare(streamed->file);
+        if (const auto status = runIntoOutput(runner, report, *streamed, progress)) {
             return status_ = withNotes(*status);
         }
     }
@@ -253,7 +260,7 @@ ExitStatus CommandLineJob::run(Progress &progress)
     }
     if (status_ == exitDone) {
         describePdfs(job_, report, job_.outputs);
-        status_ = writeOutputs(report, job_.outputs, progress, command_.quiet, &notes_);
+        status_ = writeOutputs(report, job_.outputs, progress, command_.quiet, folders_, &notes_);
     }
     return status_ = withNotes(status_);
 }
@@ -261,7 +268,7 @@ ExitStatus CommandLineJob::run(Progress &progress)
 /// Writes the file of the notes. A status of a report that is good is that of its notes.
 ExitStatus CommandLineJob::withNotes(ExitStatus status) const
 {
-    const bool areWritten = !command_.notes || !hasNotes_ || writeNotesFile(notes_, notesFile());
+    const bool areWritten = !command_.notes || !hasNotes_ || writeNotesFile(notes_, notesFile(), folders_);
     return status == exitDone && !areWritten ? exitOutput : status;
 }
 

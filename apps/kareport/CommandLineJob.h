@@ -5,6 +5,7 @@
 #include "JobNotes.h"
 #include "JobRunner.h"
 #include "JsonSource.h"
+#include "OutputFolders.h"
 #include "Progress.h"
 #include "UReportDoc.h"
 
@@ -23,6 +24,8 @@ public:
     /// `exitDone` while nothing is wrong with the job.
     ExitStatus status() const { return status_; }
     const Job &job() const { return job_; }
+    /// How many notes there are on the report that was made.
+    qsizetype noteCount() const { return static_cast<qsizetype>(notes_.said().size()); }
     /// Says that the job cannot be used, before anything of it was written.
     void fail(const QString &text);
     /// Whether the job needs a running QGuiApplication.
@@ -52,6 +55,7 @@ private:
     JsonSource source_;
     Job job_;
     ExitStatus status_ = exitDone;
+    OutputFolders folders_;
     JobNotes notes_;        ///< on the report
     bool hasNotes_ = false; ///< it came to them
 };

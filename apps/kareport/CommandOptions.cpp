@@ -2,56 +2,37 @@
 
 #include "OutputKind.h"
 
-#include <CLI/CLI.hpp>
-
 namespace kareport
 {
 
-QStringList optionTexts(const std::vector<std::string> &values)
+namespace
+{
+
+QStringList textsOf(const std::vector<std::string> &words)
 {
     QStringList list;
-    for (const std::string &value : values) {
-        list.append(QString::fromLocal8Bit(value.data(), static_cast<qsizetype>(value.size())));
+    for (const std::string &word : words) {
+        list.append(textOf(word));
     }
     return list;
 }
 
-QString optionText(const std::string &value)
-{
-    return QString::fromLocal8Bit(value.data(), static_cast<qsizetype>(value.size()));
-}
-
-std::optional<QString> optionTextIfAny(const std::optional<std::string> &value)
-{
-    return value ? std::optional(optionText(*value)) : std::nullopt;
-}
-
-std::string outputKindsHelp()
-{
-    return outputKindNames().toStdString();
-}
-
-ConvertCommand ConvertOptions::command() const
-{
-    return {optionText(input), optionText(output), optionText(as), optionTexts(sets), progress, quiet};
-}
-
-CLI::App *addConvert(CLI::App &program, ConvertOptions &options)
+CLI::App *addConvert(CLI::App &program, ConvertWords &words, ValueKinds &kinds)
 {
     CLI::App *convert =
         program.add_subcommand("convert", "Convert a saved report to another kind, by the endings of the names");
-    convert->add_option("IN", options.input, "Saved report: a report file, rich text, or plain text in UTF-8")
+    kinds
+        .note(ValueKind::SavedReport,
+              convert->add_option("IN", words.input, "Saved report: a report file, rich text, or plain text in UTF-8"))
         ->required();
-    convert->add_option("OUT", options.output, "Output file; - for standard output")->required();
-    convert->add_option("--as", options.as, "Kind of the output if its name does not show it: " + outputKindsHelp())
-        ->type_name("KIND");
-    convert
-        ->add_option("--set", options.sets,
-                     "Set a key of the page, such as page.linesPerPage=60. Can be given several times")
-        ->type_name("KEY=VALUE")
-        ->allow_extra_args(false);
-    convert->add_flag("--progress", options.progress, "Show the progress of the work");
-    convert->add_flag("--quiet", options.quiet, "Print nothing but errors");
+    kinds.note(ValueKind::File, convert->add_option("OUT", words.output, "Output file; - for standard output"))
+        ->required();
+    addAs(*convert, words.as, "Kind of the output if its name does not show it", kinds);
+    addSets(*convert, words.sets, ValueKind::PageKey,
+            "Set a key of the page, such as page.linesPerPage=60. Can be given several times", kinds);
+    addParents(*convert, words.parents);
+    convert->add_flag("--progress", words.progress, "Show the progress of the work");
+    convert->add_flag("--quiet", words.quiet, "Print nothing but errors");
     convert->footer(
         "The pages of a PDF are those of the report: its header lines give the number of lines of a page. A\n"
         "report without header lines is cut into pages as measured, or as page.linesPerPage says.\n"
@@ -61,28 +42,39 @@ CLI::App *addConvert(CLI::App &program, ConvertOptions &options)
     return convert;
 }
 
-CheckCommand CheckOptions::command() const
+CLI::App *addTemplates(CLI::App &program, TemplatesWords &words, ValueKinds &kinds)
 {
-    return {optionTexts(files), optionTexts(sets), strict, optionTextIfAny(notes), json, progress, quiet};
+    CLI::App *templates = program.add_subcommand("templates", "List the templates of a template file");
+    kinds.note(ValueKind::TemplateFile, templates->add_option("FILE", words.file, "Template file"))->required();
+    kinds
+        .note(ValueKind::TemplateName,
+              templates->add_option("-n,--name", words.name,
+                                    "Show this template's tables, blocks, dictionaries and options"))
+        ->type_name("NAME");
+    templates->add_flag("--json", words.json, "Write JSON, for programs");
+    return templates;
 }
 
-CLI::App *addCheck(CLI::App &program, CheckOptions &options)
+CLI::App *addCheck(CLI::App &program, CheckWords &words, ValueKinds &kinds)
 {
     CLI::App *check = program.add_subcommand(
         "check", "Report what in template files is not read as it looks, and how the data of jobs fits its template");
-    check->add_option("FILE", options.files, "Template file (XML) or job file (JSON), - for a job on standard input")
+    kinds
+        .note(ValueKind::CheckedFile,
+              check->add_option("FILE", words.files,
+                                "Template file (XML) or job file (JSON), - for a job on standard input"))
         ->required();
-    check
-        ->add_option("--set", options.sets,
-                     "Set a key of the jobs, such as settings.lengthUnit=ft. Can be given several times")
-        ->type_name("KEY=VALUE")
-        ->allow_extra_args(false);
-    check->add_flag("--strict", options.strict, "Treat it as an error when data and template do not match");
-    check->add_option("--notes", options.notes, "Write the notes on the data of a job to a file, as JSON")
+    addSets(*check, words.sets, ValueKind::SetKey,
+            "Set a key of the jobs, such as settings.lengthUnit=ft. Can be given several times", kinds);
+    check->add_flag("--strict", words.strict, "Treat it as an error when data and template do not match");
+    kinds
+        .note(ValueKind::File,
+              check->add_option("--notes", words.notes, "Write the notes on the data of a job to a file, as JSON"))
         ->type_name("FILE");
-    check->add_flag("--json", options.json, "Write JSON, for programs");
-    check->add_flag("--progress", options.progress, "Show the progress of the work");
-    check->add_flag("--quiet", options.quiet, "Print nothing but errors");
+    addParents(*check, words.parents);
+    check->add_flag("--json", words.json, "Write JSON, for programs");
+    check->add_flag("--progress", words.progress, "Show the progress of the work");
+    check->add_flag("--quiet", words.quiet, "Print nothing but errors");
     check->footer(
         "Each remark is one line, file:line:column: warning|error: text. Of a job, the template, the data and all steps\n"
         "are checked, and each field that data is printed in is listed: the width of its column, the widest value with its\n"
@@ -92,6 +84,137 @@ CLI::App *addCheck(CLI::App &program, CheckOptions &options)
         "  kareport check survey.xml stakeout.json\n"
         "  kareport check stakeout.json --set settings.lengthUnit=usft");
     return check;
+}
+
+CLI::App *addNew(CLI::App &program, NewWords &words, ValueKinds &kinds)
+{
+    CLI::App *add = program.add_subcommand("new", "Write a template, data and a job to start with");
+    kinds.note(
+        ValueKind::Folder,
+        add->add_option("DIR", words.folder,
+                        "Folder that they are written into and named after, made if it is not there; the current "
+                        "folder otherwise"));
+    add->add_flag("--parents", words.parents, "Make the folders that DIR is in as well");
+    add->add_flag("--quiet", words.quiet, "Print nothing but errors");
+    add->footer("Nothing that is there is replaced.\n"
+                "Examples:\n"
+                "  kareport new harbour\n"
+                "  kareport render harbour/harbour.json");
+    return add;
+}
+
+CommandWords wordsOf(const CLI::App &command, const ValueKinds &kinds)
+{
+    CommandWords words{textOf(command.get_name()), textOf(command.get_description()), {}, {}};
+    for (const CLI::Option *option : command.get_options()) {
+        OptionWords one;
+        one.kind = kinds.of(option);
+        one.description = textOf(option->get_description());
+        one.isRepeated = option->get_expected_max() > 1;
+        if (option->get_positional()) {
+            one.valueName = textOf(option->get_name(true));
+            words.arguments.push_back(one);
+            continue;
+        }
+        one.longName = QStringLiteral("--") + textOf(option->get_lnames().front());
+        one.shortName = option->get_snames().empty() ? QString() : u'-' + textOf(option->get_snames().front());
+        one.valueName = one.kind == ValueKind::Flag ? QString() : textOf(option->get_type_name());
+        words.options.push_back(one);
+    }
+    return words;
+}
+
+} // namespace
+
+QString textOf(const std::string &word)
+{
+    return QString::fromLocal8Bit(word.data(), static_cast<qsizetype>(word.size()));
+}
+
+CLI::Option *ValueKinds::note(ValueKind kind, CLI::Option *option)
+{
+    kinds_.insert_or_assign(option, kind);
+    return option;
+}
+
+ValueKind ValueKinds::of(const CLI::Option *option) const
+{
+    const auto found = kinds_.find(option);
+    return found != kinds_.end() ? found->second : ValueKind::Flag;
+}
+
+void addAs(CLI::App &command, std::string &as, const char *text, ValueKinds &kinds)
+{
+    const std::string sentence = std::string(text) + ": " + outputKindNames().toStdString();
+    kinds.note(ValueKind::OutputKind, command.add_option("--as", as, sentence))->type_name("KIND");
+}
+
+void addSets(CLI::App &command, std::vector<std::string> &sets, ValueKind kind, const char *text, ValueKinds &kinds)
+{
+    kinds.note(kind, command.add_option("--set", sets, text))->type_name("KEY=VALUE")->allow_extra_args(false);
+}
+
+void addParents(CLI::App &command, bool &parents)
+{
+    command.add_flag("--parents", parents, "Make the folders of outputs that are not there");
+}
+
+ConvertCommand ConvertWords::command() const
+{
+    return {textOf(input), textOf(output), textOf(as), textsOf(sets), parents, progress, quiet};
+}
+
+CheckCommand CheckWords::command() const
+{
+    return {textsOf(files), textsOf(sets), strict,   notes ? std::optional(textOf(*notes)) : std::nullopt,
+            json,           parents,       progress, quiet};
+}
+
+TemplatesCommand TemplatesWords::command() const
+{
+    return {textOf(file), textOf(name), json};
+}
+
+NewCommand NewWords::command() const
+{
+    return {textOf(folder), parents, quiet};
+}
+
+CommandLine::CommandLine()
+{
+    program.name("kareport");
+    program.set_version_flag("--version", "kareport " KAREPORT_VERSION);
+    program.require_subcommand(1);
+    program.footer("Exit status: 0 done, 1 wrong command line, 2 wrong input (nothing of it is written), "
+                   "3 an output could not be written.\n"
+                   "See kareport COMMAND --help for the options of a command.");
+    renderCommand = addRender(program, render, kinds);
+    watchCommand = addWatch(program, watch, kinds);
+    convertCommand = addConvert(program, convert, kinds);
+    templatesCommand = addTemplates(program, templates, kinds);
+    checkCommand = addCheck(program, check, kinds);
+    newCommand = addNew(program, newJob, kinds);
+    viewCommand = program.add_subcommand("view", "Open a report, a job or a template in a window");
+    kinds
+        .note(ValueKind::ViewedFile,
+              viewCommand->add_option("FILE", viewFile, "Report (.rep, .rtf), job (.json) or template (.xml)"))
+        ->required();
+    helpCommand = program.add_subcommand("help", "Show the help of a command");
+    kinds.note(ValueKind::Command, helpCommand->add_option("COMMAND", helpFor, "Command; all of them otherwise"));
+    completionCommand = program.add_subcommand("completion", "Print what completes the command line in a shell");
+    kinds.note(ValueKind::Shell, completionCommand->add_option("SHELL", shell, "bash, zsh or fish"))->required();
+    completionCommand->footer("The package has installed it already.\n"
+                              "Example:\n"
+                              "  source <(kareport completion bash)");
+}
+
+std::vector<CommandWords> CommandLine::words() const
+{
+    std::vector<CommandWords> words;
+    for (const CLI::App *command : program.get_subcommands([](const CLI::App *) { return true; })) {
+        words.push_back(wordsOf(*command, kinds));
+    }
+    return words;
 }
 
 } // namespace kareport

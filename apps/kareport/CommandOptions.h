@@ -1,25 +1,33 @@
 #pragma once
 
+#include "CommandWords.h"
 #include "Commands.h"
 
+#include <CLI/CLI.hpp>
+
+#include <map>
 #include <optional>
 #include <string>
 #include <vector>
 
-namespace CLI
-{
-class App;
-}
-
 namespace kareport
 {
 
-/// The text of a word of the command line.
-QString optionText(const std::string &value);
-QStringList optionTexts(const std::vector<std::string> &values);
-std::optional<QString> optionTextIfAny(const std::optional<std::string> &value);
-/// The names of the kinds of outputs, for the help.
-std::string outputKindsHelp();
+/// A word of the command line.
+QString textOf(const std::string &word);
+
+/// What the options take that were added to a command line, beside what its parser knows of them.
+class ValueKinds
+{
+public:
+    /// Notes what an option takes. @return the option
+    CLI::Option *note(ValueKind kind, CLI::Option *option);
+    /// `ValueKind::Flag` for an option that was not noted.
+    ValueKind of(const CLI::Option *option) const;
+
+private:
+    std::map<const CLI::Option *, ValueKind> kinds_;
+};
 
 /// What the options about the data of the short form are read into.
 struct DataWords
@@ -39,8 +47,8 @@ struct DataWords
     DataOptions options() const;
 };
 
-/// What the options of `kareport render` are read into.
-struct RenderOptions
+/// What the options of `kareport render`, and those of `kareport watch`, are read into.
+struct RenderWords
 {
     std::vector<std::string> jobs;
     std::string jobList;
@@ -58,46 +66,99 @@ struct RenderOptions
     bool strict = false;
     std::optional<std::string> notes;
     DataWords dataWords;
+    bool parents = false;
     bool progress = false;
     bool quiet = false;
 
     RenderCommand command() const;
 };
 
-/// Adds the command. The options must live until the command line has been parsed.
-CLI::App *addRender(CLI::App &program, RenderOptions &options);
-
 /// What the options of `kareport convert` are read into.
-struct ConvertOptions
+struct ConvertWords
 {
     std::string input;
     std::string output;
     std::string as;
     std::vector<std::string> sets;
+    bool parents = false;
     bool progress = false;
     bool quiet = false;
 
     ConvertCommand command() const;
 };
 
-/// Adds the command, as `addRender`.
-CLI::App *addConvert(CLI::App &program, ConvertOptions &options);
-
 /// What the options of `kareport check` are read into.
-struct CheckOptions
+struct CheckWords
 {
     std::vector<std::string> files;
     std::vector<std::string> sets;
     bool strict = false;
     std::optional<std::string> notes;
     bool json = false;
+    bool parents = false;
     bool progress = false;
     bool quiet = false;
 
     CheckCommand command() const;
 };
 
-/// Adds the command, as `addRender`.
-CLI::App *addCheck(CLI::App &program, CheckOptions &options);
+/// What the options of `kareport templates` are read into.
+struct TemplatesWords
+{
+    std::string file;
+    std::string name;
+    bool json = false;
+
+    TemplatesCommand command() const;
+};
+
+/// What the options of `kareport new` are read into.
+struct NewWords
+{
+    std::string folder = ".";
+    bool parents = false;
+    bool quiet = false;
+
+    NewCommand command() const;
+};
+
+/// The command line: its commands, and what their words are read into.
+struct CommandLine
+{
+    CommandLine();
+
+    CLI::App program{"Fixed-pitch reports for civil engineering and surveying"};
+    ValueKinds kinds;
+    RenderWords render;
+    RenderWords watch;
+    ConvertWords convert;
+    TemplatesWords templates;
+    CheckWords check;
+    NewWords newJob;
+    std::string viewFile;
+    std::string helpFor;
+    std::string shell;
+    CLI::App *renderCommand;
+    CLI::App *watchCommand;
+    CLI::App *convertCommand;
+    CLI::App *templatesCommand;
+    CLI::App *checkCommand;
+    CLI::App *newCommand;
+    CLI::App *viewCommand;
+    CLI::App *helpCommand;
+    CLI::App *completionCommand;
+
+    /// All commands with all their options.
+    std::vector<CommandWords> words() const;
+};
+
+CLI::App *addRender(CLI::App &program, RenderWords &words, ValueKinds &kinds);
+CLI::App *addWatch(CLI::App &program, RenderWords &words, ValueKinds &kinds);
+
+/// Adds an option that gives the kinds of outputs; one that sets keys of a job, or with `PageKey` of its page; one that makes
+/// missing folders.
+void addAs(CLI::App &command, std::string &as, const char *text, ValueKinds &kinds);
+void addSets(CLI::App &command, std::vector<std::string> &sets, ValueKind kind, const char *text, ValueKinds &kinds);
+void addParents(CLI::App &command, bool &parents);
 
 } // namespace kareport

@@ -20,10 +20,13 @@ ExitStatus stoppedBefore(const Output &output)
 
 } // namespace
 
-ExitStatus sayWritten(const Output &output, const OutputResult &result, bool isEmpty, bool quiet)
+ExitStatus sayWritten(const Output &output, const OutputResult &result, bool isEmpty, bool quiet,
+                      const OutputFolders &folders)
 {
     if (result.problem) {
-        printError(QStringLiteral("kareport: ") + *result.problem);
+        const auto reason = folders.whyNotWritten(output.file);
+        printError(QStringLiteral("kareport: ") +
+                   (reason ? Xlate("\"%1\" could not be written: %2").arg(output.file, *reason) : *result.problem));
     }
     if (!result.isWritten()) {
         return exitOutput;
@@ -35,7 +38,7 @@ ExitStatus sayWritten(const Output &output, const OutputResult &result, bool isE
 }
 
 ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, Progress &progress, bool quiet,
-                        JobNotes *notes)
+                        const OutputFolders &folders, JobNotes *notes)
 {
     ExitStatus status = exitDone;
     for (const Output &output : outputs) {
@@ -52,6 +55,7 @@ ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, 
         if (!output.isStandardOutput()) {
             progress.begin(Xlate("Writing %1").arg(output.file), 0);
         }
+        folders.prepare(output.file);
         const OutputResult result = writeOutput(report, output, progress);
         if (result.isReaderGone) {
             progress.finish();
@@ -70,7 +74,7 @@ ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, 
                 notes->add(note);
             }
         }
-        status = std::max(status, sayWritten(output, result, report.IsEmpty(), quiet));
+        status = std::max(status, sayWritten(output, result, report.IsEmpty(), quiet, folders));
     }
     return status;
 }

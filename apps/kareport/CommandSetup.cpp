@@ -1,5 +1,6 @@
 #include "CommandSetup.h"
 
+#include "NearestName.h"
 #include "OutputKind.h"
 #include "Signals.h"
 #include "Xlate.h"
@@ -12,7 +13,7 @@ namespace kareport
 std::optional<QString> wrongKindName(const QString &as)
 {
     if (!as.isEmpty() && !outputKindFromName(as)) {
-        return Xlate("--as: one of %1 was expected").arg(outputKindNames());
+        return QStringLiteral("--as: ") + oneOfExpected(as, outputKindNames().split(QStringLiteral(", ")));
     }
     return std::nullopt;
 }

@@ -37,6 +37,7 @@ struct RenderCommand
     std::optional<QString> limit; ///< "10M" for the size that no output may exceed
     bool strict = false;          ///< notes are errors
     std::optional<QString> notes; ///< a file that notes are written to, as JSON
+    bool parents = false;         ///< make the folders of the outputs
     bool progress = false;
     bool quiet = false;
 
@@ -61,7 +62,8 @@ struct ConvertCommand
     QString input;
     QString output;
     QString as;
-    QStringList sets; ///< keys of the page
+    QStringList sets;     ///< keys of the page
+    bool parents = false; ///< make the folder of the output
     bool progress = false;
     bool quiet = false;
 
@@ -87,8 +89,31 @@ struct CheckCommand
     bool strict = false;          ///< what render would note is an error
     std::optional<QString> notes; ///< a file that the notes on a job are written to, as JSON
     bool json = false;
+    bool parents = false; ///< make the folder of the notes
     bool progress = false;
     bool quiet = false; ///< errors alone
+
+    /// What is wrong with the options together; nothing when they make sense.
+    std::optional<QString> usageError() const;
+    /// `argc` and `argv` are the program's own, for Qt.
+    ExitStatus run(int &argc, char **argv) const;
+};
+
+/// `kareport new`
+struct NewCommand
+{
+    QString folder;       ///< its name becomes that of the files; it is made if it is not there
+    bool parents = false; ///< make the folders that it is in as well
+    bool quiet = false;
+
+    /// Writes a template, data and a job that makes a report of them. Nothing that is there is replaced.
+    ExitStatus run() const;
+};
+
+/// `kareport watch`
+struct WatchCommand
+{
+    RenderCommand render; ///< of one job file
 
     /// What is wrong with the options together; nothing when they make sense.
     std::optional<QString> usageError() const;

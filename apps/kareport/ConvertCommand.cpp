@@ -120,7 +120,11 @@ ExitStatus ConvertCommand::run(int &argc, char **argv) const
     for (const QString &warning : quiet ? QStringList() : saved.warnings) {
         printError(Xlate("kareport: warning: \"%1\": %2").arg(input, warning));
     }
-    return writeOutputs(report, job.outputs, bar, quiet);
+    const ExitStatus status = writeOutputs(report, job.outputs, bar, quiet, OutputFolders(parents));
+    if (status == exitDone) {
+        bar.complete();
+    }
+    return status;
 }
 
 } // namespace kareport

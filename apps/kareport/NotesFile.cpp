@@ -28,14 +28,16 @@ QString namedAfterJob(QString name, const QString &jobFile)
     return jobFile.isEmpty() ? name : name.replace(QStringLiteral("{}"), QFileInfo(jobFile).completeBaseName());
 }
 
-bool writeNotesFile(const JobNotes &notes, const QString &file)
+bool writeNotesFile(const JobNotes &notes, const QString &file, const OutputFolders &folders)
 {
+    folders.prepare(file);
     const QByteArray json = notes.toJson();
     QString problem;
     const bool isWritten = replaceFile(
         file, [&json](QIODevice &device) { return device.write(json) == json.size(); }, &problem);
     if (!isWritten) {
-        printError(Xlate("kareport: \"%1\" could not be written: %2").arg(file, problem));
+        printError(Xlate("kareport: \"%1\" could not be written: %2")
+                       .arg(file, folders.whyNotWritten(file).value_or(problem)));
     }
     return isWritten;
 }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "JobNotes.h"
+#include "OutputFolders.h"
 
 #include <QString>
 
@@ -18,6 +19,6 @@ std::optional<QString> wrongNotesFile(const std::optional<QString> &file, bool a
 QString namedAfterJob(QString name, const QString &jobFile);
 
 /// Writes the notes on a job to a file, and says on standard error why that was not possible. @return whether it was
-bool writeNotesFile(const JobNotes &notes, const QString &file);
+bool writeNotesFile(const JobNotes &notes, const QString &file, const OutputFolders &folders);
 
 } // namespace kareport

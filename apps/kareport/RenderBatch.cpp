@@ -31,6 +31,7 @@ ExitStatus RenderBatch::run(const QStringList &jobs)
             break;
         }
         progress_.setPrefix(QStringLiteral("%1/%2 ").arg(i + 1).arg(jobs.size()));
+        progress_.beginShare(static_cast<std::size_t>(i), static_cast<std::size_t>(jobs.size()));
         progress_.begin(jobs[i], 0);
         ExitStatus status = exitInput;
         try {
@@ -40,6 +41,10 @@ ExitStatus RenderBatch::run(const QStringList &jobs)
         }
         failed_ += status == exitDone || status == exitInterrupted ? 0 : 1;
         worst = std::max(worst, status);
+    }
+    // The work is at its end also when some of the jobs have failed.
+    if (worst != exitInterrupted) {
+        progress_.complete();
     }
     eraseProgress();
     if (!command_.quiet || worst == exitInterrupted) {

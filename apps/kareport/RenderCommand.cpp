@@ -111,15 +111,20 @@ ExitStatus RenderCommand::run(int &argc, char **argv) const
     if (job.status() != exitDone) {
         return job.status();
     }
+    TerminalProgress bar(progress);
     if (onlyOutdated && isUpToDate(job.job(), isShort() ? QString() : jobs.first())) {
+        bar.complete();
         if (!quiet) {
             printError(Xlate("kareport: all is up to date; nothing was written"));
         }
         return exitDone;
     }
     const auto application = startQt(argc, argv, job.needsFonts());
-    TerminalProgress bar(progress);
-    return job.run(bar);
+    const ExitStatus status = job.run(bar);
+    if (status == exitDone) {
+        bar.complete();
+    }
+    return status;
 }
 
 } // namespace kareport

@@ -1,138 +1,154 @@
 #include "CommandOptions.h"
 
-#include <CLI/CLI.hpp>
-
 namespace kareport
 {
 
 namespace
 {
 
-void addDataOptions(CLI::App &render, DataWords &words)
+QStringList textsOf(const std::vector<std::string> &words)
+{
+    QStringList list;
+    for (const std::string &word : words) {
+        list.append(textOf(word));
+    }
+    return list;
+}
+
+std::optional<QString> textIfAny(const std::optional<std::string> &word)
+{
+    return word ? std::optional(textOf(*word)) : std::nullopt;
+}
+
+void addDataOptions(CLI::App &render, DataWords &words, ValueKinds &kinds)
 {
     const char *group = "Data of --data";
-    render
-        .add_option("--delimiter", words.delimiter,
-                    "Delimiter of the cells: a character, tab, whitespace, or auto to detect it; a comma "
-                    "otherwise")
-        ->type_name("CHAR")
-        ->group(group);
-    render
-        .add_option("--columns", words.columns,
-                    "Names of the columns in their order, such as Number,Northing,-, or columns of variables by "
-                    "name or number, such as Elevation=Height,Number=1")
-        ->type_name("LIST")
-        ->allow_extra_args(false)
-        ->group(group);
-    render.add_option("--order", words.order, "The columns in short form, such as PNEZD; - skips one")
-        ->type_name("LETTERS")
-        ->group(group);
-    render.add_option("--units", words.units, "Units of the numbers, such as length=usft,angle=dms")
-        ->type_name("LIST")
-        ->allow_extra_args(false)
-        ->group(group);
-    render.add_option("--decimal", words.decimal, "Decimal sign of the numbers, . or ,")
-        ->type_name("CHAR")
-        ->group(group);
-    render.add_option("--thousands", words.thousands, "Separator of groups of three digits")
-        ->type_name("CHAR")
-        ->group(group);
-    render.add_option("--encoding", words.encoding, "utf-8, latin-1, windows-1252 or utf-16")
-        ->type_name("NAME")
-        ->group(group);
-    render.add_option("--comment", words.comment, "Skip lines that begin with this character")
-        ->type_name("CHAR")
-        ->group(group);
-    render.add_option("--skip", words.skip, "Skip this many lines at the beginning")->type_name("N")->group(group);
+    const auto add = [&](ValueKind kind, const char *name, auto &value, const char *type, const char *text) {
+        return kinds.note(kind, render.add_option(name, value, text))->type_name(type)->group(group);
+    };
+    add(ValueKind::Delimiter, "--delimiter", words.delimiter, "CHAR",
+        "Delimiter of the cells: a character, tab, whitespace, or auto to detect it; a comma otherwise");
+    add(ValueKind::Text, "--columns", words.columns, "LIST",
+        "Names of the columns in their order, such as Number,Northing,-, or columns of variables by name or number, such as "
+        "Elevation=Height,Number=1")
+        ->allow_extra_args(false);
+    add(ValueKind::Text, "--order", words.order, "LETTERS", "The columns in short form, such as PNEZD; - skips one");
+    add(ValueKind::Text, "--units", words.units, "LIST", "Units of the numbers, such as length=usft,angle=dms")
+        ->allow_extra_args(false);
+    add(ValueKind::Decimal, "--decimal", words.decimal, "CHAR", "Decimal sign of the numbers, . or ,");
+    add(ValueKind::Text, "--thousands", words.thousands, "CHAR", "Separator of groups of three digits");
+    add(ValueKind::Encoding, "--encoding", words.encoding, "NAME", "utf-8, latin-1, windows-1252 or utf-16");
+    add(ValueKind::Text, "--comment", words.comment, "CHAR", "Skip lines that begin with this character");
+    add(ValueKind::Text, "--skip", words.skip, "N", "Skip this many lines at the beginning");
     render.add_flag("--no-header", words.hasNoHeader, "The first row is data already")->group(group);
     render.add_flag("--skip-blank-lines", words.skipsBlankLines, "Skip blank lines")->group(group);
+}
+
+/// The options that say what becomes of a report, from --output on.
+void addOutputOptions(CLI::App &command, RenderWords &words, ValueKinds &kinds)
+{
+    kinds
+        .note(ValueKind::File, command.add_option("-o,--output", words.outputs,
+                                                  "Output file instead of the job's; - for standard output, {} for "
+                                                  "the job file's name. Can be given several times"))
+        ->type_name("FILE")
+        ->allow_extra_args(false);
+    addAs(command, words.as, "Kind of the outputs whose names do not show it", kinds);
+    addSets(command, words.sets, ValueKind::SetKey,
+            "Set a key of the job, such as settings.lengthUnit=ft. Can be given several times", kinds);
+    kinds
+        .note(ValueKind::Text, command.add_option("--limit", words.limit,
+                                                  "Write no report whose text or output is larger than this, such as "
+                                                  "20M (K, M, G, or bytes)"))
+        ->type_name("SIZE");
+    command.add_flag("--strict", words.strict,
+                     "Treat it as an error when a column is not a variable, or when no column fills a field");
+    kinds
+        .note(ValueKind::File,
+              command.add_option("--notes", words.notes, "Write the notes on the data to a file, as JSON"))
+        ->type_name("FILE");
+    addParents(command, words.parents);
+}
+
+void addShortForm(CLI::App &render, RenderWords &words, ValueKinds &kinds)
+{
+    kinds
+        .note(ValueKind::TemplateFile,
+              render.add_option("-t,--template", words.templateFile, "Template file, instead of a job file"))
+        ->type_name("FILE");
+    kinds
+        .note(ValueKind::TemplateName,
+              render.add_option("-n,--name", words.templateName, "Name of the template in the file"))
+        ->type_name("NAME");
+    kinds
+        .note(ValueKind::TableName,
+              render.add_option("--table", words.table, "Table of the template that the data is written through"))
+        ->type_name("NAME");
+    kinds
+        .note(ValueKind::BlockName,
+              render.add_option("--block", words.block, "Block of the template that the first row is written through"))
+        ->type_name("NAME");
+    kinds
+        .note(ValueKind::File,
+              render.add_option("-d,--data", words.data,
+                                "Data file (CSV with a header row of variable names, or as the options "
+                                "below say); - for standard input"))
+        ->type_name("FILE");
 }
 
 } // namespace
 
 DataOptions DataWords::options() const
 {
-    return {optionTextIfAny(delimiter),
-            optionTexts(columns),
-            optionTextIfAny(order),
-            optionTexts(units),
-            optionTextIfAny(decimal),
-            optionTextIfAny(thousands),
-            optionTextIfAny(encoding),
-            optionTextIfAny(comment),
-            skip,
-            hasNoHeader,
+    return {textIfAny(delimiter), textsOf(columns),    textIfAny(order),   textsOf(units), textIfAny(decimal),
+            textIfAny(thousands), textIfAny(encoding), textIfAny(comment), skip,           hasNoHeader,
             skipsBlankLines};
 }
 
-RenderCommand RenderOptions::command() const
+RenderCommand RenderWords::command() const
 {
-    return {
-        optionTexts(jobs),
-        optionText(jobList),
-        optionTextIfAny(slice),
-        onlyOutdated,
-        {optionText(templateFile), optionText(templateName), optionText(table), optionText(block), optionText(data)},
-        dataWords.options(),
-        optionTexts(outputs),
-        optionText(as),
-        optionTexts(sets),
-        optionTextIfAny(limit),
-        strict,
-        optionTextIfAny(notes),
-        progress,
-        quiet};
+    return {textsOf(jobs),
+            textOf(jobList),
+            textIfAny(slice),
+            onlyOutdated,
+            {textOf(templateFile), textOf(templateName), textOf(table), textOf(block), textOf(data)},
+            dataWords.options(),
+            textsOf(outputs),
+            textOf(as),
+            textsOf(sets),
+            textIfAny(limit),
+            strict,
+            textIfAny(notes),
+            parents,
+            progress,
+            quiet};
 }
 
-CLI::App *addRender(CLI::App &program, RenderOptions &options)
+CLI::App *addRender(CLI::App &program, RenderWords &words, ValueKinds &kinds)
 {
     CLI::App *render =
         program.add_subcommand("render", "Make reports from job files, or one from a template and a data file");
-    render->add_option("JOB", options.jobs,
-                       "Job file (JSON), - for standard input; several are run one after the other");
-    render->add_option("--jobs", options.jobList, "File with the name of a job file on each line; - for standard input")
+    kinds.note(ValueKind::JobFile,
+               render->add_option("JOB", words.jobs,
+                                  "Job file (JSON), - for standard input; several are run one after the other"));
+    kinds
+        .note(ValueKind::File,
+              render->add_option("--jobs", words.jobList,
+                                 "File with the name of a job file on each line; - for standard input"))
         ->type_name("FILE");
-    render
-        ->add_option("--slice", options.slice,
-                     "Run only every Nth job, beginning with the Kth, so that several processes share a list")
+    kinds
+        .note(ValueKind::Text,
+              render->add_option(
+                  "--slice", words.slice,
+                  "Run only every Nth job, beginning with the Kth, so that several processes share a list"))
         ->type_name("K/N");
-    render->add_flag("--update", options.onlyOutdated,
+    render->add_flag("--update", words.onlyOutdated,
                      "Skip a job whose outputs are newer than its job file, template and data");
-    render->add_option("-t,--template", options.templateFile, "Template file, instead of a job file")
-        ->type_name("FILE");
-    render->add_option("-n,--name", options.templateName, "Name of the template in the file")->type_name("NAME");
-    render->add_option("--table", options.table, "Table of the template that the data is written through")
-        ->type_name("NAME");
-    render->add_option("--block", options.block, "Block of the template that the first row is written through")
-        ->type_name("NAME");
-    render
-        ->add_option(
-            "-d,--data", options.data,
-            "Data file (CSV with a header row of variable names, or as the options below say); - for standard input")
-        ->type_name("FILE");
-    render
-        ->add_option("-o,--output", options.outputs,
-                     "Output file instead of the job's; - for standard output, {} for the job file's name. Can be "
-                     "given several times")
-        ->type_name("FILE")
-        ->allow_extra_args(false);
-    render->add_option("--as", options.as, "Kind of the outputs whose names do not show it: " + outputKindsHelp())
-        ->type_name("KIND");
-    render
-        ->add_option("--set", options.sets,
-                     "Set a key of the job, such as settings.lengthUnit=ft. Can be given several times")
-        ->type_name("KEY=VALUE")
-        ->allow_extra_args(false);
-    render
-        ->add_option("--limit", options.limit,
-                     "Write no report whose text or output is larger than this, such as 20M (K, M, G, or bytes)")
-        ->type_name("SIZE");
-    render->add_flag("--strict", options.strict,
-                     "Treat it as an error when a column is not a variable, or when no column fills a field");
-    render->add_option("--notes", options.notes, "Write the notes on the data to a file, as JSON")->type_name("FILE");
-    render->add_flag("--progress", options.progress, "Show the progress of the work");
-    render->add_flag("--quiet", options.quiet, "Print nothing but errors");
-    addDataOptions(*render, options.dataWords);
+    addShortForm(*render, words, kinds);
+    addOutputOptions(*render, words, kinds);
+    render->add_flag("--progress", words.progress, "Show the progress of the work");
+    render->add_flag("--quiet", words.quiet, "Print nothing but errors");
+    addDataOptions(*render, words.dataWords, kinds);
     render->footer(
         "Examples:\n"
         "  kareport render stakeout.json\n"
@@ -140,9 +156,28 @@ CLI::App *addRender(CLI::App &program, RenderOptions &options)
         "  kareport render stakeout.json --set settings.lengthUnit=usft -o stakeout-ft.rep\n"
         "  kareport render --template survey.xml --name CONTROL --table Points --data points.csv -o points.txt\n"
         "  total-station | kareport render -t survey.xml -n CONTROL --table Points --data - --no-header --order PNEZD\n"
-        "  kareport render jobs/*.json -o 'sheets/{}.pdf'\n"
+        "  kareport render jobs/*.json --parents -o 'sheets/{}.pdf'\n"
         "  find jobs -name '*.json' | sort | kareport render --jobs - --slice 1/8 --update");
     return render;
+}
+
+CLI::App *addWatch(CLI::App &program, RenderWords &words, ValueKinds &kinds)
+{
+    CLI::App *watch = program.add_subcommand(
+        "watch", "Make a job's reports, and again when the job, its template or its data changes");
+    kinds.note(ValueKind::JobFile, watch->add_option("JOB", words.jobs, "Job file (JSON)"))
+        ->required()
+        ->expected(1)
+        ->allow_extra_args(false);
+    addOutputOptions(*watch, words, kinds);
+    watch->add_flag("--quiet", words.quiet, "Print nothing but errors");
+    watch->footer(
+        "A line tells of each run: when and how long, the outputs, the number of notes. What is wrong is said, and the\n"
+        "earlier outputs stay. Press Ctrl+C to stop.\n"
+        "Examples:\n"
+        "  kareport watch stakeout.json\n"
+        "  kareport watch stakeout.json -o preview.pdf --set settings.lengthUnit=usft");
+    return watch;
 }
 
 } // namespace kareport

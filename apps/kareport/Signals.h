@@ -8,6 +8,10 @@ namespace kareport
 /// the program where it is: a file that is half written is taken away. Signals that the caller has switched off stay so.
 void catchInterrupts();
 
+/// A descriptor that can be read as soon as a signal asks the program to end, for a program that waits in an event loop. It
+/// stays open. @return -1 when the system gives none
+int interruptDescriptor();
+
 /// Ends the program by the signal that interrupted it, so that a shell knows why, and ends its loop as well. Returns when
 /// there was none.
 void endByInterrupt();

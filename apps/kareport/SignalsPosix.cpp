@@ -7,6 +7,7 @@
 #include <atomic>
 #include <csignal>
 #include <ctime>
+#include <fcntl.h>
 #include <initializer_list>
 #include <string_view>
 #include <unistd.h>
@@ -22,6 +23,7 @@ constexpr long patience = 200'000'000; ///< nanoseconds that work has for coming
 std::atomic<int> interruptingSignal{0};
 std::atomic<bool> hasPatienceTimer{false};
 timer_t patienceTimer;
+std::atomic<int> interruptPipe{-1}; ///< the end that is written to
 
 // What a handler uses must be free of locks.
 static_assert(std::atomic<bool>::is_always_lock_free && std::atomic<int>::is_always_lock_free);
@@ -56,6 +58,9 @@ extern "C" void noteInterrupt(int signal)
         endAtOnce(signal);
     }
     setInterrupted(true);
+    if (interruptPipe >= 0) {
+        [[maybe_unused]] const ssize_t written = write(interruptPipe, "", 1);
+    }
     const itimerspec once = {{0, 0}, {0, patience}};
     timer_settime(patienceTimer, 0, &once, nullptr);
 }
@@ -97,6 +102,19 @@ void catchInterrupts()
         handle(signal, noteInterrupt);
     }
     handle(SIGPIPE, endForClosedReader);
+}
+
+int interruptDescriptor()
+{
+    int ends[2];
+    if (pipe2(ends, O_CLOEXEC | O_NONBLOCK) != 0) {
+        return -1;
+    }
+    interruptPipe = ends[1];
+    if (interruptingSignal != 0) {
+        [[maybe_unused]] const ssize_t written = write(interruptPipe, "", 1);
+    }
+    return ends[0];
 }
 
 void endByInterrupt()

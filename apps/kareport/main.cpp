@@ -1,106 +1,125 @@
+#include "CommandLineErrors.h"
 #include "CommandOptions.h"
 #include "Commands.h"
+#include "Completion.h"
+#include "NearestName.h"
 #include "ProcessSetup.h"
 #include "Signals.h"
-
-#include <CLI/CLI.hpp>
+#include "Xlate.h"
 
 #include <cstdio>
 #include <new>
 #include <sstream>
-#include <string>
 
 namespace
 {
 
+using kareport::CommandLine;
 using kareport::exitUsage;
+using kareport::textOf;
+
+void printText(const QString &text)
+{
+    for (const QString &line : text.isEmpty() ? QStringList() : text.chopped(1).split(u'\n')) {
+        kareport::printLine(line);
+    }
+}
+
+/// Says what is wrong with the command line. @param command  of which it is; empty for the program
+int wrongUsage(const QString &sentence, const QString &command)
+{
+    kareport::printError(QStringLiteral("kareport: ") + sentence);
+    const QString blank = command.isEmpty() ? QString() : QStringLiteral(" ");
+    kareport::printError(QStringLiteral("See kareport%1 --help.").arg(blank + command));
+    return exitUsage;
+}
 
 /// Runs a command that makes reports.
 template <typename Command>
 int runReportCommand(const Command &command, const char *name, int argc, char **argv)
 {
     if (const auto wrong = command.usageError()) {
-        kareport::printError(QStringLiteral("kareport: ") + *wrong);
-        kareport::printError(QStringLiteral("See kareport %1 --help.").arg(QLatin1StringView(name)));
-        return exitUsage;
+        return wrongUsage(*wrong, QString::fromLatin1(name));
     }
     return command.run(argc, argv);
 }
 
-/// Prints the help, or what is wrong with the command line and with which of its words.
-int exitParsing(const CLI::App &program, const CLI::ParseError &error)
+/// Prints the help or the version, or what is wrong with the command line and with which of its words.
+int exitParsing(const CommandLine &line, const CLI::ParseError &error)
 {
-    std::ostringstream out;
-    std::ostringstream wrong;
-    const int status = program.exit(error, out, wrong);
-    const auto print = [](const std::ostringstream &stream, void (*printOne)(const QString &)) {
-        const QString all = kareport::optionText(stream.str());
-        for (const QString &line : all.isEmpty() ? QStringList() : all.chopped(1).split(u'\n')) {
-            printOne(line);
-        }
-    };
-    print(out, kareport::printLine);
-    print(wrong, kareport::printError);
-    return status == 0 ? 0 : exitUsage;
+    if (error.get_exit_code() == static_cast<int>(CLI::ExitCodes::Success)) {
+        std::ostringstream out;
+        line.program.exit(error, out, out);
+        printText(textOf(out.str()));
+        return kareport::exitDone;
+    }
+    const auto parsed = line.program.get_subcommands();
+    return wrongUsage(parsingMistake(line, error), parsed.empty() ? QString() : textOf(parsed.front()->get_name()));
+}
+
+/// As `kareport COMMAND --help`.
+int showHelp(const CommandLine &line)
+{
+    const QStringList names = commandNames(line.words());
+    const QString name = textOf(line.helpFor);
+    if (name.isEmpty()) {
+        printText(
+            textOf(line.program.get_formatter()->make_help(&line.program, "kareport", CLI::AppFormatMode::Normal)));
+        return kareport::exitDone;
+    }
+    if (!names.contains(name)) {
+        return wrongUsage(kareport::unknownCommand(name, names), QString());
+    }
+    printText(textOf(line.program.get_subcommand(line.helpFor)->help("kareport")));
+    return kareport::exitDone;
+}
+
+int printCompletion(const CommandLine &line)
+{
+    const auto shell = kareport::shellFromName(textOf(line.shell));
+    if (!shell) {
+        const QString expected = kareport::oneOfExpected(textOf(line.shell), fixedValuesOf(kareport::ValueKind::Shell));
+        return wrongUsage(QStringLiteral("\"%1\": %2").arg(textOf(line.shell), expected), QStringLiteral("completion"));
+    }
+    // A script, not a text for a terminal: its characters stay as they are.
+    const QByteArray script = completionScript(*shell, line.words()).toUtf8();
+    std::fwrite(script.constData(), 1, static_cast<std::size_t>(script.size()), stdout);
+    return kareport::exitDone;
 }
 
 int runProgram(int argc, char **argv)
 {
-    CLI::App program("Fixed-pitch reports for civil engineering and surveying");
-    program.name("kareport");
-    program.set_version_flag("--version", "kareport " KAREPORT_VERSION);
-    program.require_subcommand(1);
-    program.footer("Exit status: 0 done, 1 wrong command line, 2 wrong input (nothing of it is written), "
-                   "3 an output could not be written.\n"
-                   "See kareport COMMAND --help for the options of a command.");
-
-    kareport::RenderOptions render;
-    CLI::App *renderCommand = kareport::addRender(program, render);
-
-    kareport::ConvertOptions convert;
-    CLI::App *convertCommand = kareport::addConvert(program, convert);
-
-    std::string templatesFile;
-    std::string templatesName;
-    bool templatesJson = false;
-    CLI::App *templatesCommand = program.add_subcommand("templates", "List the templates of a template file");
-    templatesCommand->add_option("FILE", templatesFile, "Template file")->required();
-    templatesCommand
-        ->add_option("-n,--name", templatesName, "Show this template's tables, blocks, dictionaries and options")
-        ->type_name("NAME");
-    templatesCommand->add_flag("--json", templatesJson, "Write JSON, for programs");
-
-    kareport::CheckOptions check;
-    CLI::App *checkCommand = kareport::addCheck(program, check);
-
-    std::string viewFile;
-    CLI::App *viewCommand = program.add_subcommand("view", "Open a report, a job or a template in a window");
-    viewCommand->add_option("FILE", viewFile, "Report (.rep, .rtf), job (.json) or template (.xml)")->required();
-
+    CommandLine line;
     try {
-        program.parse(argc, argv);
+        line.program.parse(argc, argv);
     } catch (const CLI::ParseError &error) {
-        return exitParsing(program, error);
+        return exitParsing(line, error);
     }
-
-    if (renderCommand->parsed()) {
-        return runReportCommand(render.command(), "render", argc, argv);
+    if (line.renderCommand->parsed()) {
+        return runReportCommand(line.render.command(), "render", argc, argv);
     }
-    if (convertCommand->parsed()) {
-        return runReportCommand(convert.command(), "convert", argc, argv);
+    if (line.watchCommand->parsed()) {
+        return runReportCommand(kareport::WatchCommand{line.watch.command()}, "watch", argc, argv);
     }
-    if (viewCommand->parsed()) {
-        return kareport::ViewCommand{kareport::optionText(viewFile)}.run(argc, argv);
+    if (line.convertCommand->parsed()) {
+        return runReportCommand(line.convert.command(), "convert", argc, argv);
     }
-    if (templatesCommand->parsed()) {
-        return kareport::TemplatesCommand{kareport::optionText(templatesFile), kareport::optionText(templatesName),
-                                          templatesJson}
-            .run();
+    if (line.viewCommand->parsed()) {
+        return kareport::ViewCommand{textOf(line.viewFile)}.run(argc, argv);
     }
-    if (checkCommand->parsed()) {
-        return runReportCommand(check.command(), "check", argc, argv);
+    if (line.templatesCommand->parsed()) {
+        return line.templates.command().run();
     }
-    return exitUsage;
+    if (line.checkCommand->parsed()) {
+        return runReportCommand(line.check.command(), "check", argc, argv);
+    }
+    if (line.newCommand->parsed()) {
+        return line.newJob.command().run();
+    }
+    if (line.completionCommand->parsed()) {
+        return printCompletion(line);
+    }
+    return showHelp(line);
 }
 
 /// Ends the program's output. @return the exit status

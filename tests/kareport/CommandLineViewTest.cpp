@@ -34,7 +34,7 @@ TEST(CommandLineView, WhatCannotBeShownIsSaid)
     folder.put("a.pdf", "%PDF-1.4");
     folder.put("pdf.rep", "%PDF-1.4");
     const Row rows[] = {
-        {{QStringLiteral("view")}, ":9", 1, "FILE is required", "no file"},
+        {{QStringLiteral("view")}, ":9", 1, "FILE was expected", "no file"},
         {{QStringLiteral("view"), QStringLiteral("gone.rep")}, ":9", 2, "gone.rep", "a file that is not there"},
         {{QStringLiteral("view"), QStringLiteral(".")}, ":9", 2, "there is no file", "a folder"},
         {{QStringLiteral("view"), QStringLiteral("a.pdf")}, ":9", 2, "A PDF cannot be opened as a report", "a PDF"},

@@ -42,6 +42,8 @@ add_test(NAME package.example.plain COMMAND ${example}/plain --once)
 set_tests_properties(package.example PROPERTIES FIXTURES_SETUP package.examples)
 set_tests_properties(package.example.plain PROPERTIES FIXTURES_REQUIRED package.examples TIMEOUT 60
                                                       ENVIRONMENT QT_QPA_PLATFORM=offscreen)
+add_test(NAME package.completion COMMAND ${CMAKE_CURRENT_SOURCE_DIR}/package/completion-test.sh ${prefix} site-functions)
+set_tests_properties(package.completion PROPERTIES FIXTURES_REQUIRED package)
 set_tests_properties(package.binaries package.exports package.listed package.use package.pkg-config package.example
                      PROPERTIES FIXTURES_REQUIRED package)
 # What our package says to those who link with it leads none of them into the current folder.
