@@ -59,6 +59,8 @@ public:
 
     /// The files that are read, with their complete names: no output takes the place of one.
     virtual QStringList files() const { return {}; }
+    /// The same with those that are not there yet and would be read if they came.
+    virtual QStringList possibleFiles() const { return files(); }
     /// Whether the files and the job are all that the rows come from, so that their times tell whether a report is older.
     virtual bool isAllInFiles() const { return true; }
     /// Whether the data itself says the units of its numbers; those of the job then do not count.

@@ -35,6 +35,22 @@ QHash<QString, QString> sourcesOf(const Job &job, const QString &path)
     return sources;
 }
 
+/// The files that a job is made of, with those of its data that `dataFiles` names.
+QStringList filesOf(const Job &job, const QString &path, QStringList (DataSource::*dataFiles)() const)
+{
+    QStringList files;
+    if (!path.isEmpty()) {
+        files.append(QFileInfo(path).absoluteFilePath());
+    }
+    if (job.reportTemplate) {
+        files.append(job.reportTemplate->file);
+    }
+    for (const Job::DataSet &set : job.data) {
+        files += (set.source.get()->*dataFiles)();
+    }
+    return files;
+}
+
 } // namespace
 
 QString outputIdentity(const Output &output)
@@ -71,19 +87,9 @@ std::optional<OutputClash> outputClash(const Job &job, const std::vector<Output>
     return std::nullopt;
 }
 
-QStringList sourceFiles(const Job &job, const QString &path)
+QStringList watchedFiles(const Job &job, const QString &path)
 {
-    QStringList sources;
-    if (!path.isEmpty()) {
-        sources.append(QFileInfo(path).absoluteFilePath());
-    }
-    if (job.reportTemplate) {
-        sources.append(job.reportTemplate->file);
-    }
-    for (const Job::DataSet &set : job.data) {
-        sources += set.source->files();
-    }
-    return sources;
+    return filesOf(job, path, &DataSource::possibleFiles);
 }
 
 bool isUpToDate(const Job &job, const QString &path)
@@ -92,7 +98,7 @@ bool isUpToDate(const Job &job, const QString &path)
                      [](const Job::DataSet &set) { return set.source->isAllInFiles(); })) {
         return false;
     }
-    const QStringList sources = sourceFiles(job, path);
+    const QStringList sources = filesOf(job, path, &DataSource::files);
     return !job.outputs.empty() && std::all_of(job.outputs.begin(), job.outputs.end(), [&](const Output &output) {
         const QFileInfo written(output.file);
         return !output.isStandardOutput() && written.isFile() &&

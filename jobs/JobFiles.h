@@ -26,10 +26,10 @@ std::optional<OutputClash> outputClash(const Job &job, const QString &path);
 /// The same for other outputs than the job's own.
 std::optional<OutputClash> outputClash(const Job &job, const std::vector<Output> &outputs, const QString &path);
 
-/// The files that a job is made of, with their complete names: the job file, its template file and its data files. They need
-/// not exist.
+/// The files whose changes make another report of a job, with their complete names: the job file, its template file and its
+/// data files. They need not exist.
 /// @param path  the job file; empty for a job that is in no file
-QStringList sourceFiles(const Job &job, const QString &path);
+QStringList watchedFiles(const Job &job, const QString &path);
 
 /// Whether every output of a job is a file that was written later than all that the job is made of was changed: the job
 /// file, its template file and its data files. A file with the very time of an output counts as changed after it. A job

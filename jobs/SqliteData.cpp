@@ -34,15 +34,23 @@ public:
     QStringList files() const override
     {
         QStringList files(query_.file);
-        // What other programs have written and not yet moved into the file.
-        const QString log = query_.file + QStringLiteral("-wal");
-        if (QFileInfo::exists(log)) {
-            files.append(log);
+        if (QFileInfo::exists(logFile())) {
+            files.append(logFile());
         }
         return files;
     }
 
+    QStringList possibleFiles() const override
+    {
+        QStringList files(query_.file);
+        files.append(logFile());
+        return files;
+    }
+
 private:
+    /// What other programs have written and not yet moved into the file.
+    QString logFile() const { return query_.file + QStringLiteral("-wal"); }
+
     SqliteQuery query_;
 };
 

@@ -135,7 +135,7 @@ ExitStatus JobWatch::makeOnce()
     }
     if (job.status() == exitDone) {
         // Of a job that cannot be read, those that were known are watched on.
-        const QStringList files = sourceFiles(job.job(), command_.jobs.first());
+        const QStringList files = watchedFiles(job.job(), command_.jobs.first());
         for (const QString &file : files) {
             if (!files_.contains(file)) {
                 watch_.expect(file);

@@ -60,6 +60,12 @@ TEST(CommandLineTerminal, NothingThatIsPrintedHoldsACommand)
         {QStringLiteral("check"), name + QStringLiteral(".json")},
         {QStringLiteral("convert"), name, QStringLiteral("x.txt")},
         {QStringLiteral("view"), name},
+        {QStringLiteral("watch"), name},
+        {QStringLiteral("new"), name + QStringLiteral("/x/y")},
+        {QStringLiteral("new"), QStringLiteral("x") + name, QStringLiteral("--parents")},
+        {QStringLiteral("help"), name},
+        {QStringLiteral("completion"), name},
+        {name},
     };
     for (const QStringList &line : lines) {
         const ProgramRun run = runProgram(folder.path(), line, {{"LC_ALL", "C.UTF-8"}});
