@@ -59,9 +59,14 @@ void addMissing(DataRemarks &remarks, ColumnRemarks &column, const FieldFormatte
 
 } // namespace
 
+QString chainageWordOf(const QString &heading)
+{
+    return heading.contains(u"Chainage") ? QStringLiteral("Chainage") : QStringLiteral("Station");
+}
+
 QString withChainageLabel(QString heading, const QString &label)
 {
-    const QString word = heading.contains(u"Chainage") ? QStringLiteral("Chainage") : QStringLiteral("Station");
+    const QString word = chainageWordOf(heading);
     return heading.replace(word, label);
 }
 
@@ -73,11 +78,15 @@ void DataWriter::writeBlock(const UXmlReportBlock &block, const UDataObject &obj
         *remarks = remarksFor(block, *remarks);
         remarks->rows = 1;
     }
+    feed_.beginBlock(block);
     for (int i = 0; i < block.GetFieldsCount(); ++i) {
         const sXmlReportField field = block.GetField(i);
         const FieldFormatter formatter(field);
         const UDictEntry *entry = object.Find(formatter.id());
         if (entry == nullptr) {
+            if (feed_.isOpen() && formatter.marker() == FieldMarker::None) {
+                feed_.skip();
+            }
             continue;
         }
         row_.clear();
@@ -87,6 +96,9 @@ void DataWriter::writeBlock(const UXmlReportBlock &block, const UDataObject &obj
         ColumnRemarks *about = remarks != nullptr ? &remarks->columns[static_cast<std::size_t>(i)] : nullptr;
         WidestText *widest = about != nullptr && remarks->measures ? &about->widest : nullptr;
         const Shown shown = formatter.append(row_, options_, entry->kind(), entry->GetData(), QStringView(), widest);
+        if (feed_.isOpen() && formatter.marker() == FieldMarker::None) {
+            feed_.take(formatter, entry, QStringView(), row_.from(start), shown);
+        }
         // No column follows that a wide value would move: only what shows as "#" is lost.
         if (about != nullptr && !formatter.shows(entry->kind())) {
             addMissing(*remarks, *about, formatter, options_, 0);
@@ -101,6 +113,10 @@ void DataWriter::writeBlock(const UXmlReportBlock &block, const UDataObject &obj
             remarks->addWidest(*about, 0);
             remarks->setLine(page_.lineCount());
         }
+    }
+    if (feed_.isOpen()) {
+        feed_.endRow(object);
+        feed_.endTable();
     }
     endOutput(linesAfter);
 }
@@ -124,7 +140,9 @@ void DataWriter::writeTable(const UXmlReportTable &table, UDataObjectList &list,
     DataRemarks unwanted;
     DataRemarks &remarks = layout.remarks != nullptr ? *layout.remarks : unwanted;
     remarks = remarksFor(table, remarks);
+    feed_.beginTable(table, layout.chainageLabel);
     writeRows(table, list, remarks);
+    feed_.endTable();
     endOutput(layout.linesAfter);
 }
 
@@ -157,6 +175,9 @@ void DataWriter::writeRows(const UXmlReportTable &table, UDataObjectList &list, 
     for (std::size_t index = 1; object != nullptr && page_.losses() == losses; ++index) {
         // The row is complete before the next object is asked for: a list may hold one object at a time.
         formatRow(fields, *object, index - 1, remarks);
+        if (feed_.isOpen()) {
+            feed_.endRow(*object);
+        }
         remarks.rows = index;
         object = list.GetAt(index);
         if (object != nullptr) {
@@ -191,6 +212,7 @@ void DataWriter::formatRow(const std::vector<FieldFormatter> &fields, const UDat
             const UDictEntry *entry = object.Find(field.id());
             WidestText *const widest = remarks.measures ? &about.widest : nullptr;
             const qsizetype widestBefore = about.widest.width;
+            const std::size_t start = row_.size();
             const Shown shown = entry != nullptr
                                     ? field.append(row_, options_, entry->kind(), entry->GetData(), suffix, widest)
                                     : field.append(row_, options_, ValueKind::None, nullptr, suffix, widest);
@@ -199,6 +221,9 @@ void DataWriter::formatRow(const std::vector<FieldFormatter> &fields, const UDat
             } else { // a text that another variable of the same identifier has is no number
                 about.wideZeros += shown == Shown::TooWide ? 1U : 0U;
                 addMissing(remarks, about, field, options_, row);
+            }
+            if (feed_.isOpen()) {
+                feed_.take(field, entry, suffix, row_.from(start), shown);
             }
             if (about.widest.width != widestBefore) {
                 remarks.addWidest(about, row);

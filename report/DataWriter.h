@@ -3,6 +3,7 @@
 #include "DataRemarks.h"
 #include "FieldFormatter.h"
 #include "PageWriter.h"
+#include "ResultFeed.h"
 #include "UDataObjectList.h"
 #include "UXmlReportBlock.h"
 #include "UXmlReportTable.h"
@@ -16,7 +17,10 @@ namespace kareport
 class DataWriter
 {
 public:
-    DataWriter(PageWriter &page, const FormatOptions &options) : page_(page), options_(options) {}
+    /// @param results  receives the values that are written; may be null
+    DataWriter(PageWriter &page, const FormatOptions &options, ResultSink *results = nullptr)
+        : page_(page), options_(options), feed_(results, options)
+    {}
 
     /// @param remarks  receives what the block does not show as it is; may be null
     void writeBlock(const UXmlReportBlock &block, const UDataObject &object, int linesBefore, int linesAfter,
@@ -43,8 +47,11 @@ private:
     PageWriter &page_;
     const FormatOptions &options_;
     TextBuffer row_;
+    ResultFeed feed_;
 };
 
+/// The word of a table's heading that the chainage column's own label replaces: "Chainage" or, where there is none, "Station".
+QString chainageWordOf(const QString &heading);
 /// A table's heading with the chainage column's own label: it replaces every "Chainage" or, where there is none, every
 /// "Station".
 QString withChainageLabel(QString heading, const QString &label);

@@ -23,6 +23,7 @@ void ReportAccess::setHooks(UReportDoc &report, const ReportHooks &hooks)
     ReportParts &parts = *report.parts_;
     parts.hooks = hooks;
     parts.data.remarks = hooks.remarks;
+    parts.data.results = hooks.results;
     const Placeholders *placeholders = hooks.placeholders;
     parts.page.setPageMarks(placeholders != nullptr);
     parts.data.labelText = nullptr;

@@ -6,6 +6,7 @@ namespace kareport
 {
 
 class Placeholders;
+class ResultSink;
 struct DataRemarks;
 struct LoadedText;
 
@@ -15,6 +16,7 @@ struct ReportHooks
     const Placeholders *placeholders = nullptr; ///< of labels and headings; null where all texts stay as they are
     DataRemarks *remarks =
         nullptr; ///< receives what the table or block written last does not show as it is; may be null
+    ResultSink *results = nullptr; ///< receives the values of tables and blocks while they are written; may be null
 };
 
 /// What the programs of this project do with a report and a host does not: it cannot make what the functions take.

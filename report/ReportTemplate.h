@@ -16,6 +16,8 @@
 namespace kareport
 {
 
+class ResultSink;
+
 /// The template that a report's data is written through, with one table and one block of it, and what the texts of the
 /// values depend on besides their fields.
 ///
@@ -30,6 +32,7 @@ public:
     static inline bool printHash = false; ///< values wider than their column show as "#": one setting for all reports
     std::optional<bool> ownPrintHash;     ///< instead of that; nothing for none
     DataRemarks *remarks = nullptr;     ///< receives what a table does not show as it is; null when they are not wanted
+    ResultSink *results = nullptr;      ///< receives the values that are written; null when they are not wanted
     UXmlReportTpl::LabelText labelText; ///< what is shown of the labels of templates that are loaded; null for all
 
     /// Loads a template from the first of the files that has it, and then the table and the block unless their names are

@@ -131,6 +131,11 @@ bool FieldFormatter::showsZeroForNone(const FormatOptions &options) const
     }
 }
 
+bool FieldFormatter::showsText() const
+{
+    return type_ == VARIABLE_TEXT || type_ == VARIABLE_NAME || type_ == VARIABLE_NUMBER;
+}
+
 void FieldFormatter::appendValue(TextBuffer &out, const FormatOptions &options, const Input &input,
                                  QStringView suffix) const
 {
@@ -264,12 +269,7 @@ void FieldFormatter::appendThickness(TextBuffer &out, double value) const
 /// The text of a value without the blanks that fill its column. Those of a text from the data are its own.
 QStringView FieldFormatter::ownText(QStringView text) const
 {
-    switch (type_) {
-    case VARIABLE_TEXT:
-    case VARIABLE_NAME:
-    case VARIABLE_NUMBER: return text;
-    default: return text.trimmed();
-    }
+    return showsText() ? text : text.trimmed();
 }
 
 /// Fills the column. A text wider than its column stays whole: no digit is ever cut off.

@@ -44,6 +44,9 @@ public:
     /// Whether a value that is missing shows as a number 0.
     bool showsZeroForNone(const FormatOptions &options) const;
 
+    /// Whether it shows texts of the data, which have blanks of their own.
+    bool showsText() const;
+
     /// Appends a value's text, fitted to the field's column.
     /// @param kind    what `value` points to; `None` and any other number count as 0, false or an empty text
     /// @param suffix  "+" shows an offset with its sign, anything else with "L" or "R" after it

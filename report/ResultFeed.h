@@ -1,0 +1,47 @@
+#pragma once
+
+#include "FieldFormatter.h"
+#include "ResultSink.h"
+#include "TextBuffer.h"
+
+#include <vector>
+
+class UXmlReportBlock;
+class UXmlReportTable;
+
+namespace kareport
+{
+
+/// Hands the values of a table or a block to a sink of results while they are formatted.
+class ResultFeed
+{
+public:
+    /// @param sink  null where nobody wants results: then nothing is done
+    ResultFeed(ResultSink *sink, const FormatOptions &options) : sink_(sink), options_(options) {}
+
+    void beginTable(const UXmlReportTable &table, const QString &chainageLabel);
+    void beginBlock(const UXmlReportBlock &block);
+    /// Whether rows are wanted.
+    bool isOpen() const { return isOpen_; }
+
+    /// Takes the next value of a row that has been formatted.
+    /// @param entry  null for a value that is missing
+    /// @param shown  the text in its column, and how it shows there
+    void take(const FieldFormatter &field, const UDictEntry *entry, QStringView suffix, QStringView shown, Shown how);
+    /// Leaves the next column of a row without a value and without a text.
+    void skip();
+    void endRow(const UDataObject &object);
+    void endTable();
+
+private:
+    void begin(ResultTable &table);
+
+    ResultSink *sink_;
+    const FormatOptions &options_;
+    bool isOpen_ = false;
+    ResultRow row_;
+    TextBuffer texts_;              ///< of the row's values, one after the other
+    std::vector<std::size_t> ends_; ///< of the texts
+};
+
+} // namespace kareport
