@@ -123,6 +123,9 @@ CheckedFile checkJob(const QString &file, const Expected<JsonSource> &source, bo
     if (const auto clash = outputClash(job, json.path())) {
         checked.add(true, json.errorAt({QStringLiteral("output"), clash->output}, clash->text));
     }
+    if (const auto wrong = ResultOutputs::wrongResult(job)) {
+        checked.add(true, json.errorAt({QStringLiteral("output"), wrong->output}, wrong->text));
+    }
     if (!notesFile.isEmpty()) {
         if (const auto clash = outputClash(job, {{notesFile, OutputKind::Text}}, json.path())) {
             checked.isNotesFileNeeded = true;

@@ -69,18 +69,20 @@ std::optional<OutputClash> outputClash(const Job &job, const std::vector<Output>
     QHash<QString, const Output *> earlier;
     for (qsizetype i = 0; i < qsizetype(outputs.size()); ++i) {
         const Output &output = outputs[static_cast<std::size_t>(i)];
+        const auto number = static_cast<qsizetype>(output.sideOf.value_or(static_cast<std::size_t>(i)));
         const QString identity = outputIdentity(output);
         if (identity.isEmpty()) {
             continue;
         }
         if (const auto source = sources.constFind(identity); source != sources.constEnd()) {
-            return OutputClash{i, source->arg(output.file)};
+            return OutputClash{number, source->arg(output.file)};
         }
         const Output *other = earlier.value(identity);
         // Both reports are written to standard output, one after the other.
         if (other != nullptr && !(other->isStandardOutput() && output.isStandardOutput())) {
-            return OutputClash{i, Xlate("\"%1\" is the file of the output \"%2\" already: another file was expected")
-                                      .arg(output.file, other->file)};
+            return OutputClash{number,
+                               Xlate("\"%1\" is the file of the output \"%2\" already: another file was expected")
+                                   .arg(output.file, other->file)};
         }
         earlier.insert(identity, &output);
     }

@@ -1,5 +1,6 @@
 #include "JobOutputs.h"
 
+#include "HtmlResult.h"
 #include "Interrupt.h"
 #include "JobRunner.h"
 #include "PdfExport.h"
@@ -27,9 +28,16 @@ namespace kareport
 namespace
 {
 
+constexpr std::size_t copiedAtOnce = std::size_t(1) << 20; ///< bytes, between which an interrupt is looked for
+
 QString tooLarge(const Output &output)
 {
     return Xlate("\"%1\" was not written: it would have more than %2").arg(output.file, sizeText(*output.mostBytes));
+}
+
+QString couldNotBeWritten(const Output &output, const QString &reason)
+{
+    return Xlate("\"%1\" could not be written: %2").arg(output.file, reason);
 }
 
 /// More characters than this are not worth a note each: there is no font for a whole script.
@@ -46,12 +54,18 @@ bool isReplaced(const Output &output)
 class OutputWriting
 {
 public:
-    OutputWriting(UReportDoc &report, const Output &output, Progress &progress)
-        : report_(report), output_(output), progress_(progress)
+    OutputWriting(UReportDoc &report, const Output &output, Progress &progress, ResultFile *results)
+        : report_(report), output_(output), progress_(progress), results_(results)
     {}
 
     OutputResult write()
     {
+        if (results_ != nullptr && !results_->finish()) {
+            return {results_->isTooLarge() ? tooLarge(output_) : couldNotBeWritten(output_, results_->problem())};
+        }
+        if (results_ != nullptr) {
+            warnings_ = results_->warnings();
+        }
         if (output_.mostBytes && !isReplaced(output_) && isTooLarge()) {
             return {tooLarge(output_)};
         }
@@ -60,6 +74,17 @@ public:
         }
         if (output_.kind == OutputKind::Report && report_.IsEmpty() && !report_.HasLostText()) {
             return {};
+        }
+        // The pages after the first one come before it: it never leads to one that is not there.
+        for (std::size_t page = results_ != nullptr ? results_->pageCount() : 1; page > 1; --page) {
+            Output output = output_;
+            output.file = HtmlResult::pageName(output.file, page);
+            const auto problem = replaceOutput(output, [this, page](QIODevice &device, QString &) {
+                return writeBytes(device, results_->page(page));
+            });
+            if (problem) {
+                return {problem};
+            }
         }
         const auto problem =
             replaceOutput(output_, [this](QIODevice &device, QString &wrong) { return writeTo(device, wrong); });
@@ -113,6 +138,11 @@ private:
         case OutputKind::RichText: return writeRichTextTo(device, problem);
         case OutputKind::Pdf: return writePdfTo(device, problem);
         case OutputKind::RichTextImage: return report_.WriteRichTextFile(device);
+        case OutputKind::Xlsx:
+        case OutputKind::Html:
+        case OutputKind::Csv:
+        case OutputKind::JsonLines:
+        case OutputKind::Schema: return results_ != nullptr && writeBytes(device, results_->page(1));
         }
         return false;
     }
@@ -134,6 +164,19 @@ private:
         }
         warnings_ += notes.texts();
         return writeRichText(device, document);
+    }
+
+    bool writeBytes(QIODevice &device, std::string_view bytes)
+    {
+        for (std::size_t at = 0; at < bytes.size();) {
+            const std::string_view piece = bytes.substr(at, copiedAtOnce);
+            if (isInterrupted() ||
+                device.write(piece.data(), static_cast<qint64>(piece.size())) != qint64(piece.size())) {
+                return false;
+            }
+            at += piece.size();
+        }
+        return true;
     }
 
     bool writePdfTo(QIODevice &device, QString &problem)
@@ -161,6 +204,7 @@ private:
     UReportDoc &report_;
     const Output &output_;
     Progress &progress_;
+    ResultFile *results_;
     QStringList warnings_;
     std::vector<JobNote> notes_;
 };
@@ -185,9 +229,7 @@ std::optional<QString> replaceOutput(const Output &output, const WriteContent &w
     if (isTooLarge) {
         return tooLarge(output);
     }
-    return done ? std::nullopt
-                : std::optional(
-                      Xlate("\"%1\" could not be written: %2").arg(output.file, problem.isEmpty() ? error : problem));
+    return done ? std::nullopt : std::optional(couldNotBeWritten(output, problem.isEmpty() ? error : problem));
 }
 
 void describePdfs(const Job &job, const UReportDoc &report, std::vector<Output> &outputs)
@@ -208,15 +250,16 @@ void describePdfs(const Job &job, const UReportDoc &report, std::vector<Output> 
     }
 }
 
-OutputResult writeOutput(UReportDoc &report, const Output &output, Progress &progress)
+OutputResult writeOutput(UReportDoc &report, const Output &output, Progress &progress, ResultFile *results)
 {
-    return OutputWriting(report, output, progress).write();
+    return OutputWriting(report, output, progress, results).write();
 }
 
 std::vector<JobNote> unshownCharacters(UReportDoc &report, const Output &output, Progress &progress)
 {
-    return output.kind == OutputKind::Pdf && !makesNoPage(report) ? OutputWriting(report, output, progress).notes()
-                                                                  : std::vector<JobNote>();
+    return output.kind == OutputKind::Pdf && !makesNoPage(report)
+               ? OutputWriting(report, output, progress, nullptr).notes()
+               : std::vector<JobNote>();
 }
 
 const Output *streamedOutput(const Job &job)

@@ -3,6 +3,7 @@
 #include "Job.h"
 #include "JobNotes.h"
 #include "Progress.h"
+#include "ResultFile.h"
 #include "UReportDoc.h"
 
 #include <QString>
@@ -31,7 +32,8 @@ struct OutputResult
 void describePdfs(const Job &job, const UReportDoc &report, std::vector<Output> &outputs);
 
 /// Writes a report to where an output says. An empty report makes no report file.
-OutputResult writeOutput(UReportDoc &report, const Output &output, Progress &progress);
+/// @param results  the file of an output that is made of results, which is finished here; null for any other
+OutputResult writeOutput(UReportDoc &report, const Output &output, Progress &progress, ResultFile *results = nullptr);
 
 /// The characters of a report that an output would not show: those that no font has for a PDF. All other kinds show every
 /// character.

@@ -9,6 +9,7 @@
 #include "JsonNode.h"
 #include "NearestName.h"
 #include "Placeholders.h"
+#include "ResultOptionsReader.h"
 #include "Xlate.h"
 
 #include <QDir>
@@ -121,19 +122,39 @@ Job::Options readOptions(const JsonNode &node)
     return options;
 }
 
+/// Adds the files that say what the columns of others are.
+void addSchemas(std::vector<Output> &outputs)
+{
+    const std::size_t count = outputs.size();
+    for (std::size_t i = 0; i < count; ++i) {
+        const ResultOptions results = outputs[i].results;
+        if (!results.schema.isEmpty()) {
+            Output schema{results.schema, OutputKind::Schema};
+            schema.results = results;
+            schema.sideOf = i;
+            outputs.push_back(schema);
+        }
+    }
+}
+
 std::optional<Output> readOutput(const JsonNode &node, const QDir &folder, std::optional<OutputKind> otherwise)
 {
-    if (node.value().isObject()) {
-        node.allowOnly({"file", "as"});
+    const bool isObject = node.value().isObject();
+    const JsonNode file = isObject ? node["file"] : node;
+    const JsonNode as = node["as"];
+    const QString name = file.isText() ? readFileName(file) : QString();
+    const auto kind = as.exists() ? outputKindFromName(as.text()) : outputKindOf(name, otherwise);
+    if (isObject) {
+        node.allowOnly(kind ? outputKeys(*kind) : allOutputKeys());
     }
-    const JsonNode file = node.value().isObject() ? node["file"] : node;
     if (!file.exists()) {
         node.fail(Xlate("the key \"file\" was expected"));
         return std::nullopt;
     }
-    QString name = readFileName(file);
-    const JsonNode as = node["as"];
-    const auto kind = as.exists() ? outputKindFromName(as.text()) : outputKindOf(name, otherwise);
+    if (!file.isText()) {
+        readFileName(file); // which says what was expected
+        return std::nullopt;
+    }
     if (!kind && as.exists()) {
         as.fail(oneOfExpected(as.text(), outputKindNames().split(QStringLiteral(", "))));
         return std::nullopt;
@@ -143,7 +164,26 @@ std::optional<Output> readOutput(const JsonNode &node, const QDir &folder, std::
                       .arg(name, outputKindNames()));
         return std::nullopt;
     }
-    return Output{name == u"-" ? name : folder.filePath(name), *kind};
+    Output output{name == u"-" ? name : folder.filePath(name), *kind};
+    if (isObject) {
+        output.results = readResultOptions(node, *kind, folder);
+    }
+    return output;
+}
+
+std::vector<Output> readOutputs(const JsonNode &nodes, const QDir &folder, std::optional<OutputKind> otherwise)
+{
+    std::vector<Output> outputs;
+    if (!nodes.expectArray()) {
+        return outputs;
+    }
+    for (qsizetype i = 0; i < nodes.size(); ++i) {
+        if (const auto output = readOutput(nodes[i], folder, otherwise)) {
+            outputs.push_back(*output);
+        }
+    }
+    addSchemas(outputs);
+    return outputs;
 }
 
 /// The time on the clock that a job fixes.
@@ -209,13 +249,7 @@ Job readRoot(const JsonNode &root, const QDir &folder, bool isOnInput, const Job
     job.pdf = readPdf(root["pdf"]);
     job.data = readDataSets(root["data"], folder, isOnInput);
     job.steps = readSteps(root["report"], job);
-    if (const JsonNode outputs = root["output"]; outputs.expectArray()) {
-        for (qsizetype i = 0; i < outputs.size(); ++i) {
-            if (const auto output = readOutput(outputs[i], folder, defaults.outputKind)) {
-                job.outputs.push_back(*output);
-            }
-        }
-    }
+    job.outputs = readOutputs(root["output"], folder, defaults.outputKind);
     return job;
 }
 

@@ -85,9 +85,12 @@ std::optional<InputError> JobRunner::run(UReportDoc &report, ReportTextWriter *s
     report.SetSurroundings(surroundings);
     const auto restoredHooks =
         qScopeGuard([&report, before = ReportAccess::hooks(report)] { ReportAccess::setHooks(report, before); });
-    ReportAccess::setHooks(report, {placeholders_.get(), &remarks});
+    ReportAccess::setHooks(report, {placeholders_.get(), &remarks, results_});
     if (auto error = prepare(report)) {
         return error;
+    }
+    if (results_ != nullptr) {
+        results_->beginReport({report.GetTitle(), job_.application, surroundings.time});
     }
     report.StreamText(stream);
     const auto kept = qScopeGuard([&report] { report.StreamText(nullptr); });
@@ -99,6 +102,7 @@ std::optional<InputError> JobRunner::run(UReportDoc &report, ReportTextWriter *s
     notes_ = JobNotes();
     JobSteps steps(job_, source_, data, report, {notes_, isStrict_ || job_.strict, remarks}, isStopped);
     steps.setPlaceholders(placeholders_.get());
+    steps.setResults(results_);
     fits_.clear();
     if (isMeasuring_ && job_.reportTemplate) {
         steps.measureInto(fits_, FormatWidths(job_.reportTemplate->file, job_.reportTemplate->name));

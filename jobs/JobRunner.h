@@ -7,6 +7,7 @@
 #include "Placeholders.h"
 #include "Progress.h"
 #include "ReportSurroundings.h"
+#include "ResultOutputs.h"
 #include "StepFit.h"
 #include "UReportDoc.h"
 
@@ -43,6 +44,8 @@ public:
     void beStrict() { isStrict_ = true; }
     /// Has it measured how the data of each step fits its table or block. Off unless somebody asks: it takes time.
     void measure() { isMeasuring_ = true; }
+    /// Says which outputs receive the values that are written. They must outlive the runs; null for none.
+    void setResults(ResultOutputs *results) { results_ = results; }
     /// How the steps of the report that was made last fit, in their order, those alone that were written.
     const std::vector<StepFit> &fits() const { return fits_; }
     /// The notes on the report that was made last, also on one that was not finished.
@@ -68,6 +71,7 @@ private:
     const JsonSource &source_;
     Progress &progress_;
     std::function<bool()> isToStop_;
+    ResultOutputs *results_ = nullptr;
     bool isStrict_ = false;
     bool isMeasuring_ = false;
     std::vector<StepFit> fits_;

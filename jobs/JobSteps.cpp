@@ -29,6 +29,9 @@ void needMemory(bool isWritten)
 std::optional<InputError> JobSteps::write()
 {
     for (const Job::Step &step : job_.steps) {
+        if (results_ != nullptr) {
+            results_->beginStep(step);
+        }
         auto wrong = std::visit([&](const auto &action) { return write(action, step.path); }, step.action);
         if (wrong || isStopped_()) {
             return wrong;
@@ -42,13 +45,16 @@ JobSteps::Wrong JobSteps::write(const Job::Heading &step, const JsonPath & /*pat
 {
     const QString text = shownText(step.text);
     report_.AnnounceEntry(ReportOutline::headingLevel, QString(text).remove(QChar(pageMark)).simplified());
+    addResultText(ResultText::Heading, text, 0);
     report_.SetHeading(text, step.before, step.after);
     return std::nullopt;
 }
 
 JobSteps::Wrong JobSteps::write(const Job::Line &step, const JsonPath & /*path*/)
 {
-    report_.WriteLine(shownText(step.text), step.before, step.after, step.style);
+    const QString text = shownText(step.text);
+    addResultText(ResultText::Line, text, step.style);
+    report_.WriteLine(text, step.before, step.after, step.style);
     return std::nullopt;
 }
 
@@ -109,6 +115,7 @@ JobSteps::Wrong JobSteps::write(const Job::Block &step, const JsonPath &path)
     if (!hasRow) {
         return isStopped_() ? std::nullopt : std::optional(data_.noRow(step.data, path));
     }
+    describeResults(step.data, block->Use, nullptr);
     needMemory(report_.WriteDataBlock(step.name, &first, step.before, step.after));
     addFit(false, step.name, block->Fields, step.data, path);
     return noteValues(rows, columns, record);
@@ -140,6 +147,7 @@ JobSteps::Wrong JobSteps::write(const Job::Table &step, const JsonPath &path)
         return wrong;
     }
     report_.AnnounceEntry(ReportOutline::tableLevel, table->Name);
+    describeResults(step.data, table->Use, report_.GetTemplate()->GetSortList(step.name));
     needMemory(report_.WriteDataTable(step.name, &rows, step.before, step.after, step.headingAfter));
     if (const auto error = rows.error()) {
         return error;
@@ -174,6 +182,24 @@ QString JobSteps::shownText(const QString &text) const
     }
     const UXmlReportTpl *tpl = report_.GetTemplate();
     return placeholders_->textOf(text, tpl != nullptr ? tpl->GetTemplateTitle() : QString());
+}
+
+/// Hands a line of text to the results, which have no pages.
+void JobSteps::addResultText(ResultText kind, QString text, int style)
+{
+    if (results_ != nullptr) {
+        results_->addText(kind, text.remove(QChar(pageMark)), style);
+    }
+}
+
+void JobSteps::describeResults(const QString &data, const QString &dictionary, const sXmlSortTableReport *sort)
+{
+    if (results_ != nullptr) {
+        const Job::DataSet &set = *job_.data.constFind(data);
+        // What says its units itself is read in metres, square metres and degrees.
+        results_->describe({set.source->hasOwnUnits() ? DataUnits() : set.units,
+                            report_.GetTemplate()->GetDictionary(dictionary), sort});
+    }
 }
 
 void JobSteps::addFit(bool isTable, const QString &name, const sXmlReportFields &fields, const QString &data,

@@ -6,6 +6,7 @@
 #include "JobData.h"
 #include "JsonSource.h"
 #include "Placeholders.h"
+#include "ResultOutputs.h"
 #include "StepFit.h"
 #include "TemplatePlaces.h"
 #include "UReportDoc.h"
@@ -45,6 +46,8 @@ public:
 
     /// Says what the placeholders of lines and headings stand for; null where they have none. They must outlive the steps.
     void setPlaceholders(const Placeholders *placeholders) { placeholders_ = placeholders; }
+    /// Says which outputs receive the values that are written; null for none. They must outlive the steps.
+    void setResults(ResultOutputs *results) { results_ = results; }
     /// Adds to a list how the data of each step fits, from the remarks on it, which must have the widest values.
     void measureInto(std::vector<StepFit> &fits, FormatWidths widths)
     {
@@ -77,6 +80,8 @@ private:
     Wrong noteSortKeys(const WrittenRecord &record);
     Wrong noteSource(const RowList &rows);
     QString shownText(const QString &text) const;
+    void addResultText(ResultText kind, QString text, int style);
+    void describeResults(const QString &data, const QString &dictionary, const sXmlSortTableReport *sort);
     void addFit(bool isTable, const QString &name, const sXmlReportFields &fields, const QString &data,
                 const JsonPath &path);
     Wrong noteValues(RowList &rows, const std::optional<SourceColumns> &columns, const WrittenRecord &record);
@@ -90,6 +95,7 @@ private:
     StepNotes notes_;
     const std::function<bool()> &isStopped_;
     const Placeholders *placeholders_ = nullptr;
+    ResultOutputs *results_ = nullptr;
     std::vector<StepFit> *fits_ = nullptr; ///< null where nothing is measured
     std::unique_ptr<FormatWidths> widths_;
     std::unique_ptr<VariablePlaces>

@@ -16,9 +16,15 @@ struct KindRow
 };
 
 constexpr KindRow kinds[] = {
-    {OutputKind::Report, u"rep", u".rep"},         {OutputKind::Text, u"text", u".txt"},
-    {OutputKind::RichText, u"rtf", u".rtf"},       {OutputKind::Pdf, u"pdf", u".pdf"},
+    {OutputKind::Report, u"rep", u".rep"},
+    {OutputKind::Text, u"text", u".txt"},
+    {OutputKind::RichText, u"rtf", u".rtf"},
+    {OutputKind::Pdf, u"pdf", u".pdf"},
     {OutputKind::RichTextImage, u"rtf-image", {}}, // a ".rtf" file, which its name alone does not tell
+    {OutputKind::Xlsx, u"xlsx", u".xlsx"},
+    {OutputKind::Html, u"html", u".html"},
+    {OutputKind::Csv, u"csv", u".csv"},
+    {OutputKind::JsonLines, u"jsonl", u".jsonl"},
 };
 
 } // namespace
@@ -46,6 +52,16 @@ std::optional<OutputKind> outputKindOf(const QString &file, std::optional<Output
         }
     }
     return otherwise;
+}
+
+bool isMadeOfResults(OutputKind kind)
+{
+    return kind == OutputKind::Html || kind == OutputKind::Xlsx || isOfOneTable(kind);
+}
+
+bool isOfOneTable(OutputKind kind)
+{
+    return kind == OutputKind::Csv || kind == OutputKind::JsonLines || kind == OutputKind::Schema;
 }
 
 QString outputKindNames()

@@ -17,6 +17,7 @@ packages_build=(
     nlohmann-json3-dev      # JSON files, object by object
     libpq-dev               # PostgreSQL databases
     libsqlite3-dev          # SQLite databases and GeoPackages
+    libxlsxwriter-dev       # workbooks
     libfontconfig-dev       # where the faces of a PDF are
     libfreetype-dev         # what the glyphs of a PDF are put together from
     fonts-dejavu-core       # the fixed-pitch face that a page is measured with, and of a PDF
@@ -50,6 +51,9 @@ packages_package=(
 )
 packages_office=(
     libreoffice-writer-nogui # rich text read by another program; the tests use it where it is installed
+    libreoffice-calc-nogui  # workbooks, likewise
+    python3-openpyxl        # workbooks, likewise
+    chromium                # web pages opened in a browser, likewise
 )
 packages_bench=(
     libbenchmark-dev        # micro benchmarks
@@ -59,6 +63,7 @@ packages_compare=(
     python3                 # runs the programs and writes the page
     python3-matplotlib      # its pictures
     mawk gawk sqlite3 miller # rows to text
+    python3-openpyxl        # rows to a workbook
     xsltproc                # points of a LandXML file to text
     postgresql              # rows from a database server
     valgrind                # instructions counted

@@ -9,12 +9,14 @@
 #include "NotesFile.h"
 #include "ProcessSetup.h"
 #include "ReportTextCodec.h"
+#include "ReportTextWriter.h"
 #include "Signals.h"
 #include "SizeLimit.h"
 #include "TerminalProgress.h"
 #include "Xlate.h"
 
 #include <algorithm>
+#include <limits>
 #include <new>
 
 namespace kareport
@@ -77,7 +79,8 @@ QString CommandLineJob::notesFile() const
 /// No output may replace what the report is made of, or another output.
 void CommandLineJob::checkOutputs()
 {
-    const auto clash = outputClash(job_, source_.path());
+    auto clash = outputClash(job_, source_.path());
+    clash = clash ? clash : ResultOutputs::wrongResult(job_);
     if (!clash) {
         // Notes are an output as well, though no job has them among its own.
         std::vector<Output> withNotes = job_.outputs;
@@ -92,6 +95,19 @@ void CommandLineJob::checkOutputs()
     if (command_.outputs.isEmpty() && source_.root().toObject().contains(key)) {
         fail(exitInput, source_.errorAt({key, clash->output}, clash->text).message());
     } else {
+        fail(clash->text);
+    }
+}
+
+/// Pages that a long report goes on in must not replace anything that is needed either.
+void CommandLineJob::checkPages(const ResultOutputs &results)
+{
+    std::vector<Output> outputs = job_.outputs;
+    for (const Output &page : results.furtherPages()) {
+        outputs.push_back(page);
+    }
+    const auto clash = outputs.size() > job_.outputs.size() ? outputClash(job_, outputs, source_.path()) : std::nullopt;
+    if (clash) {
         fail(clash->text);
     }
 }
@@ -242,6 +258,10 @@ ExitStatus CommandLineJob::run(Progress &progress)
     UReportDoc report(surroundingsOf(job_));
     JobRunner runner(job_, source_, progress);
     runner.stopWhen([this] { return isReaderGone(); });
+    ResultOutputs results(job_);
+    if (!results.isEmpty()) {
+        runner.setResults(&results);
+    }
     const Output *streamed = streamedOutput(job_);
     const auto files = std::count_if(job_.outputs.begin(), job_.outputs.end(),
                                      [](const Output &output) { return !output.isStandardOutput(); });
@@ -252,15 +272,21 @@ ExitStatus CommandLineJob::run(Progress &progress)
             return status_ = withNotes(*status);
         }
     }
-    const auto error = make(runner, report, nullptr);
+    // Where nobody wants the text, it is not kept.
+    SizeLimit nowhere(nullptr, std::numeric_limits<qint64>::max());
+    ReportTextWriter noText(nowhere, LineEnds::PlainText);
+    const auto error = make(runner, report, ResultOutputs::isTextUnwanted(job_) ? &noText : nullptr);
     progress.finish();
     status_ = madeStatus(report, error);
     if (status_ == exitDone) {
         status_ = checkCharacters(report, progress);
     }
     if (status_ == exitDone) {
+        checkPages(results);
+    }
+    if (status_ == exitDone) {
         describePdfs(job_, report, job_.outputs);
-        status_ = writeOutputs(report, job_.outputs, progress, command_.quiet, folders_, &notes_);
+        status_ = writeOutputs(report, job_.outputs, progress, command_.quiet, folders_, &notes_, &results);
     }
     return status_ = withNotes(status_);
 }

@@ -47,6 +47,7 @@ private:
     void takeOutputs(std::optional<OutputKind> kindOtherwise);
     void checkOutputs();
     ExitStatus checkSize();
+    void checkPages(const ResultOutputs &results);
     bool isReaderGone() const;
     ExitStatus failTooLarge(qint64 bytes);
     ExitStatus fail(ExitStatus status, const QString &message);

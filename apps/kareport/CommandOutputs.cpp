@@ -38,7 +38,7 @@ ExitStatus sayWritten(const Output &output, const OutputResult &result, bool isE
 }
 
 ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, Progress &progress, bool quiet,
-                        const OutputFolders &folders, JobNotes *notes)
+                        const OutputFolders &folders, JobNotes *notes, const ResultOutputs *results)
 {
     ExitStatus status = exitDone;
     for (const Output &output : outputs) {
@@ -56,7 +56,8 @@ ExitStatus writeOutputs(UReportDoc &report, const std::vector<Output> &outputs, 
             progress.begin(Xlate("Writing %1").arg(output.file), 0);
         }
         folders.prepare(output.file);
-        const OutputResult result = writeOutput(report, output, progress);
+        const OutputResult result =
+            writeOutput(report, output, progress, results != nullptr ? results->fileOf(output) : nullptr);
         if (result.isReaderGone) {
             progress.finish();
             endByClosedReader();

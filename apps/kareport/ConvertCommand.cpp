@@ -83,7 +83,16 @@ std::optional<QString> ConvertCommand::usageError() const
             return Xlate("--set \"%1\": a key of the page was expected, such as page.linesPerPage=60").arg(set);
         }
     }
-    return wrongOutput(output, as);
+    if (auto wrong = wrongOutput(output, as)) {
+        return wrong;
+    }
+    const OutputKind kind = *outputKindOf(output, outputKindFromName(as));
+    if (isMadeOfResults(kind)) {
+        return Xlate(
+                   "\"%1\": a saved report has text alone, and no values that it could be made of: render its job instead")
+            .arg(output);
+    }
+    return std::nullopt;
 }
 
 ExitStatus ConvertCommand::run(int &argc, char **argv) const

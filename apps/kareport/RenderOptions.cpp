@@ -154,6 +154,7 @@ CLI::App *addRender(CLI::App &program, RenderWords &words, ValueKinds &kinds)
         "  kareport render stakeout.json\n"
         "  kareport render stakeout.json -o - | less\n"
         "  kareport render stakeout.json --set settings.lengthUnit=usft -o stakeout-ft.rep\n"
+        "  kareport render stakeout.json -o stakeout.xlsx -o stakeout.html\n"
         "  kareport render --template survey.xml --name CONTROL --table Points --data points.csv -o points.txt\n"
         "  total-station | kareport render -t survey.xml -n CONTROL --table Points --data - --no-header --order PNEZD\n"
         "  kareport render jobs/*.json --parents -o 'sheets/{}.pdf'\n"

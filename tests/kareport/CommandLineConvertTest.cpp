@@ -110,7 +110,8 @@ TEST(CommandLineConvert, AWrongCommandLineIsSaid)
     };
     const Row rows[] = {
         {"convert a.rep b.dat", "the ending of \"b.dat\" does not say the kind"},
-        {"convert a.rep b.dat --as tiff", "--as: one of rep, text, rtf, pdf, rtf-image was expected"},
+        {"convert a.rep b.dat --as tiff",
+         "--as: one of rep, text, rtf, pdf, rtf-image, xlsx, html, csv, jsonl was expected"},
         {"convert a.rep b.pdf --set title=x", "a key of the page was expected"},
         {"convert a.rep b.pdf --set page.linesPerPage=0", "linesPerPage"},
         {"convert a.rep", "OUT"},
