@@ -11,7 +11,8 @@ enum DeskCommandId : unsigned
     fileFromTemplateCommand = 33250,
     preferencesCommand = 33251,
     nextReportCommand = 33252,
-    previousReportCommand = 33253
+    previousReportCommand = 33253,
+    fileExportCommand = 33254
 };
 
 } // namespace kareport

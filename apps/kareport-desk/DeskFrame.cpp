@@ -7,6 +7,7 @@
 #include "ReportEntry.h"
 #include "ReportResources.h"
 #include "ReportSaveName.h"
+#include "SaveAs.h"
 #include "TemplateDialog.h"
 #include "UApplication.h"
 #include "UReportDoc.h"
@@ -36,6 +37,7 @@ DeskFrame::DeskFrame() : files_([this](const QString &path) { fileChanged(path);
                                              QStringLiteral(";;") + Xlate("All files (*)"));
         return path.isEmpty() ? std::nullopt : std::optional(path);
     };
+    askExport = [this](const kareport::SaveRequest &request) { return kareport::askSavePath(this, request); };
     askTemplate = [this](const QString &templateFile) -> std::optional<kareport::TemplateJob> {
         kareport::TemplateDialog dialog(this);
         if (!templateFile.isEmpty()) {

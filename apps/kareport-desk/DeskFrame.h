@@ -2,13 +2,16 @@
 
 #include "EditorHold.h"
 #include "FileWatch.h"
+#include "JobExport.h"
 #include "Recovery.h"
+#include "SaveDialog.h"
 #include "UDocument.h"
 #include "UXTPMDIFrameWnd.h"
 
 #include <QLatin1StringView>
 
 #include <functional>
+#include <map>
 #include <optional>
 
 class QMenu;
@@ -52,6 +55,9 @@ public:
     /// Asks for template and data, beginning with a template file that may be empty; a test answers instead.
     std::function<std::optional<kareport::TemplateJob>(const QString &templateFile)> askTemplate;
 
+    /// Asks where the values of a report go; a test answers instead.
+    std::function<std::optional<QString>(const kareport::SaveRequest &)> askExport;
+
 protected:
     void SettlePanes() override;
     void closeEvent(QCloseEvent *event) override;
@@ -67,6 +73,10 @@ private:
     void open();
     void fromTemplate(const QString &templateFile);
     void askPreferences();
+    /// Writes the values of the report in front into a file of another program.
+    void exportValues();
+    /// What the report in front was made of; null for one that no job made.
+    const kareport::JobOrigin *originInFront() const;
     /// Shows what a file holds that its report does not show, if anything.
     static void sayWhatIsNotShown(const QString &path, const kareport::ReadNotes &notes);
     bool finishOpening(UDocument *report, const QString &error);
@@ -102,7 +112,8 @@ private:
     std::vector<kareport::Command> commands_;
     QMenu *recentFiles_ = nullptr;
     QToolBar *toolBar_ = nullptr;
-    QStringList reading_; ///< files that are being opened now
+    QStringList reading_;                                      ///< files that are being opened now
+    std::map<const UDocument *, kareport::JobOrigin> origins_; ///< of the reports that jobs made
     kareport::FileWatch files_;
     kareport::Recovery recovery_;
     kareport::EditorHold editors_;

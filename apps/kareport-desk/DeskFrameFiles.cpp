@@ -2,6 +2,7 @@
 
 #include "AppMessageBox.h"
 #include "FileKind.h"
+#include "Folders.h"
 #include "JobLauncher.h"
 #include "ReportSaveName.h"
 #include "SavedReports.h"
@@ -85,9 +86,43 @@ bool DeskFrame::OpenTemplateJob(const kareport::TemplateJob &job)
     UDocument *report = kareport::launchTemplateJob(job, this, error, notes);
     const bool isMade = finishOpening(report, error);
     if (isMade) {
+        origins_.insert_or_assign(report, job);
         sayNotes(notes);
     }
     return isMade;
+}
+
+const kareport::JobOrigin *DeskFrame::originInFront() const
+{
+    const auto found = origins_.find(GetCommandDocument());
+    return found != origins_.end() ? &found->second : nullptr;
+}
+
+void DeskFrame::exportValues()
+{
+    const kareport::JobOrigin *found = originInFront();
+    if (found == nullptr) {
+        return;
+    }
+    const kareport::JobOrigin origin = *found; // the report may be closed while the dialog is open
+    kareport::SaveRequest request;
+    request.filter = kareport::exportFilter();
+    request.initialFolder = GetInitialOpenDir(kareport::lastReportFolder);
+    request.flags = kareport::SaveRequest::overwritePrompt | kareport::SaveRequest::pathMustExist;
+    const auto file = askExport(request);
+    if (!file) {
+        return;
+    }
+    SetLastOpenDir(*file, kareport::lastReportFolder);
+    QStringList warnings;
+    const QString problem = kareport::launchExport(origin, *file, this, warnings);
+    if (!problem.isEmpty()) {
+        AppMessageBox(problem);
+    } else if (!warnings.isEmpty()) {
+        kareport::showMessage(
+            {Xlate("\"%1\" was saved, but it differs from the report:\n\n%2").arg(*file, warnings.join(u'\n')),
+             QString(), MessageButtons::Ok, kareport::MessageIcon::Information});
+    }
 }
 
 bool DeskFrame::OpenFile(const QString &path)
@@ -124,6 +159,7 @@ bool DeskFrame::openJob(const QString &path)
     UDocument *report = kareport::launchJob(path, this, error, notes);
     const bool isMade = finishOpening(report, error);
     if (isMade) {
+        origins_.insert_or_assign(report, path);
         UApplication::Get()->AddToRecentFileList(path);
         sayNotes(notes);
     }
@@ -162,6 +198,7 @@ void DeskFrame::NoteDocumentEvent(UDocument &document, UDocument::DocumentEvent 
     if (event == UDocument::DocumentEvent::AfterCloseDocument) {
         recovery_.forget(dynamic_cast<const UReportDoc *>(&document));
         editors_.forget(dynamic_cast<const UReportDoc *>(&document));
+        origins_.erase(&document);
     }
     // A document that has just been opened or saved under a new name gets its path after the event.
     QMetaObject::invokeMethod(

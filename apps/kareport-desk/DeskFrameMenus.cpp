@@ -19,6 +19,8 @@ std::vector<kareport::Command> DeskFrame::makeCommands()
         {fileNewCommand, [this] { newReport(); }, {}},
         {fileOpenCommand, [this] { open(); }, {}},
         {fileFromTemplateCommand, [this] { fromTemplate(QString()); }, {}},
+        {fileExportCommand, [this] { exportValues(); },
+         [this](CommandState &state) { state.enabled = originInFront() != nullptr; }},
         {preferencesCommand, [this] { askPreferences(); }, {}},
         {recentFileCommand,
          {},
@@ -48,6 +50,7 @@ void DeskFrame::makeMenus()
         into.insertAction(CommandAction(before), AddCommand(into, id, text));
     };
     insert(*menu.file, fileOpenCommand, fileFromTemplateCommand, Xlate("New from &Template...\tCtrl+T"));
+    insert(*menu.file, updateTextCommand, fileExportCommand, Xlate("&Export Values...\tCtrl+E"));
     CommandAction(fileCloseCommand)->setShortcut(QKeySequence(QStringLiteral("Ctrl+W")));
     CommandAction(fileSaveAsCommand)->setShortcut(QKeySequence(QStringLiteral("Ctrl+Shift+S")));
     CommandAction(exitCommand)->setShortcut(QKeySequence(QStringLiteral("Ctrl+Q")));

@@ -190,6 +190,21 @@ UReportDoc *launchJob(const QString &path, QWidget *parent, QString &error, JobN
     return launch([&path] { return JsonSource::read(path); }, parent, error, notes);
 }
 
+QString launchExport(const JobOrigin &origin, const QString &file, QWidget *parent, QStringList &warnings)
+{
+    if (runningJob()) {
+        return Xlate("Another job is running. Wait until it has finished, or cancel it.");
+    }
+    const ValueGuard running(runningJob(), true, [](bool on) { runningJob() = on; });
+    setInterrupted(false);
+    try {
+        DialogProgress progress(parent);
+        return exportJob(origin, file, progress, warnings);
+    } catch (const std::bad_alloc &) {
+        return Xlate("There is not enough memory for this input.");
+    }
+}
+
 UReportDoc *launchTemplateJob(const TemplateJob &job, QWidget *parent, QString &error, JobNotes &notes)
 {
     return launch([&job] { return Expected<JsonSource>(JsonSource::fromObject(job.toJson())); }, parent, error, notes);

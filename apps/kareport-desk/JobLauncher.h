@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Job.h"
+#include "JobExport.h"
 #include "JobNotes.h"
 
 #include <QString>
@@ -21,5 +22,9 @@ bool isJobRunning();
 UReportDoc *launchJob(const QString &path, QWidget *parent, QString &error, JobNotes &notes);
 /// The same with a data file and a template.
 UReportDoc *launchTemplateJob(const TemplateJob &job, QWidget *parent, QString &error, JobNotes &notes);
+
+/// Writes the values of a report into a file, as `exportJob` does, with a window that shows progress and can stop it.
+/// @return as `exportJob`
+QString launchExport(const JobOrigin &origin, const QString &file, QWidget *parent, QStringList &warnings);
 
 } // namespace kareport

@@ -1,0 +1,106 @@
+#include "JobExport.h"
+
+#include "DeskPreferences.h"
+#include "Interrupt.h"
+#include "JobFiles.h"
+#include "JobOutputs.h"
+#include "JobReader.h"
+#include "JobRunner.h"
+#include "ReportTextWriter.h"
+#include "ResultOutputs.h"
+#include "SizeLimit.h"
+#include "UReportDoc.h"
+#include "Xlate.h"
+
+#include <limits>
+#include <new>
+
+namespace kareport
+{
+
+namespace
+{
+
+Expected<JsonSource> readOrigin(const JobOrigin &origin)
+{
+    if (const auto *path = std::get_if<QString>(&origin)) {
+        return JsonSource::read(*path);
+    }
+    return JsonSource::fromObject(std::get<TemplateJob>(origin).toJson());
+}
+
+/// What keeps a job from having the file for its output.
+QString wrongExport(const Job &job, const QString &path)
+{
+    if (const auto clash = outputClash(job, path)) {
+        return clash->text;
+    }
+    const auto wrong = ResultOutputs::wrongResult(job);
+    return wrong ? wrong->text : QString();
+}
+
+QString writeExport(const Job &job, const JsonSource &source, Progress &progress, QStringList &warnings)
+{
+    UReportDoc report(surroundingsOf(job));
+    ResultOutputs results(job);
+    JobRunner runner(job, source, progress);
+    runner.setResults(&results);
+    SizeLimit nowhere(nullptr, std::numeric_limits<qint64>::max());
+    ReportTextWriter noText(nowhere, LineEnds::PlainText);
+    const auto wrong = runner.run(report, ResultOutputs::isTextUnwanted(job) ? &noText : nullptr);
+    progress.finish();
+    if (wrong || isInterrupted()) {
+        return wrong ? wrong->message() : QString();
+    }
+    std::vector<Output> all = job.outputs;
+    for (const Output &page : results.furtherPages()) {
+        all.push_back(page);
+    }
+    if (const auto clash = outputClash(job, all, source.path())) {
+        return clash->text;
+    }
+    const OutputResult written =
+        writeOutput(report, job.outputs.front(), progress, results.fileOf(job.outputs.front()));
+    warnings = written.warnings;
+    return written.problem.value_or(QString());
+}
+
+} // namespace
+
+QString exportFilter()
+{
+    return Xlate("Workbook") + QStringLiteral(" (*.xlsx)|*.xlsx|") + Xlate("Web Page") +
+           QStringLiteral(" (*.html)|*.html|") + Xlate("Rows as CSV") + QStringLiteral(" (*.csv)|*.csv|") +
+           Xlate("Rows as JSON Lines") + QStringLiteral(" (*.jsonl)|*.jsonl||");
+}
+
+QString exportJob(const JobOrigin &origin, const QString &file, Progress &progress, QStringList &warnings)
+{
+    const auto kind = outputKindOf(file);
+    if (!kind || !isMadeOfResults(*kind)) {
+        return Xlate("\"%1\": one of the endings .xlsx, .html, .csv and .jsonl was expected").arg(file);
+    }
+    const auto read = readOrigin(origin);
+    if (const InputError *wrong = errorOf(read)) {
+        return wrong->message();
+    }
+    const auto &source = std::get<JsonSource>(read);
+    auto job = readJob(source, loadPreferences().jobDefaults());
+    if (const InputError *wrong = errorOf(job)) {
+        return wrong->message();
+    }
+    // Of the job's own outputs, the one of the kind says which rows are wanted, and how.
+    Output output{file, *kind};
+    for (const Output &own : std::get<Job>(job).outputs) {
+        if (own.kind == *kind) {
+            output.results = own.results;
+            break;
+        }
+    }
+    std::get<Job>(job).outputs.clear();
+    std::get<Job>(job).outputs.push_back(output);
+    const QString wrong = wrongExport(std::get<Job>(job), source.path());
+    return !wrong.isEmpty() ? wrong : writeExport(std::get<Job>(job), source, progress, warnings);
+}
+
+} // namespace kareport
