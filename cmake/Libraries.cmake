@@ -3,7 +3,7 @@
 # place of KaReportHost. The programs of this project link the layers themselves.
 
 set(KA_HOST_LAYERS ka_values ka_data ka_app ka_frame)
-set(KA_MODULE_LAYERS ka_templates ka_page ka_reportfile ka_richtext ka_pdf ka_editor ka_report ka_print ka_view ka_ui)
+set(KA_MODULE_LAYERS ka_templates ka_groups ka_page ka_reportfile ka_richtext ka_pdf ka_editor ka_report ka_print ka_view ka_ui)
 
 function(ka_shared_library target)
     add_library(${target} SHARED)

@@ -558,8 +558,51 @@ def write_road(road, profile):
     (DATA / "road.xml").write_text("\n".join(lines) + "\n", encoding="utf-8")
 
 
+# ------------------------------------------------------------------------------------------- sheets with groups and totals
+
+def write_volumes():
+    """Earthworks in sections of 20 m, in cubic metres: topsoil is only taken off, the subgrade is cut and filled."""
+    numbers = random.Random(1605)
+    rows = []
+    for layer, most_cut, most_fill in (("Topsoil", 60.0, 0.0), ("Subgrade", 420.0, 380.0), ("Capping", 0.0, 90.0)):
+        for station in range(0, 400, 20):
+            cut = most_cut * numbers.uniform(0.3, 1.0)
+            fill = most_fill * numbers.uniform(0.3, 1.0)
+            rows.append([layer, grouped(station), grouped(station + 20), fixed(cut, 3), fixed(fill, 3)])
+    write("volumes.csv", ["Layer", "From", "To", "Cut", "Fill"], rows)
+
+
+def write_estates():
+    """Parcels that a road takes land from: their areas and what is taken, in square metres."""
+    numbers = random.Random(7)
+    rows = []
+    for owner, count in (("Harbour Board", 5), ("Kestrel Farm", 3), ("A. Núñez", 2), ("Crown Estate", 4)):
+        for _ in range(count):
+            area = numbers.uniform(900.0, 48000.0)
+            rows.append([owner, str(len(rows) + 101), fixed(area, 2), fixed(area * numbers.uniform(0.02, 0.35), 2)])
+    numbers.shuffle(rows)
+    write("estates.csv", ["Owner", "Parcel", "Area", "Taken"], rows)
+
+
+def write_checks():
+    """Pegs as designed and as measured again, some of them beyond the tolerance of 20 mm. One was not found."""
+    numbers = random.Random(20)
+    rows = []
+    for number in range(1, 41):
+        north, east = 4100.0 + 12.5 * number, 18440.0 + 8.75 * number
+        height = ground(north, east)
+        off = [numbers.gauss(0.0, 0.009) for _ in range(3)]
+        measured = [fixed(value + by, 3) for value, by in zip((north, east, height), off)]
+        rows.append([f"P{number}", fixed(north, 3), fixed(east, 3), fixed(height, 3),
+                     *(measured if number != 17 else ["", "", ""])])
+    write("checks.csv", ["Point", "North", "East", "Height", "MeasuredNorth", "MeasuredEast", "MeasuredHeight"], rows)
+
+
 def main():
     DATA.mkdir(exist_ok=True)
+    write_volumes()
+    write_estates()
+    write_checks()
     road = make_alignment()
     profile = make_profile(road)
     write_alignment(road)

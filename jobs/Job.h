@@ -5,6 +5,7 @@
 #include "DefaultPrinter.h"
 #include "JsonPlaces.h"
 #include "OutputKind.h"
+#include "TableShape.h"
 #include "UJobSettings.h"
 
 #include <QDateTime>
@@ -107,6 +108,7 @@ struct Job
         int before;
         int after;
         int headingAfter;
+        TableShape shape = {};
     };
     struct Clear
     {};

@@ -23,6 +23,7 @@ QString keyOf(JobNote::Kind kind)
     case JobNote::Kind::NotFinite: return QStringLiteral("not-finite");
     case JobNote::Kind::UnknownSortKey: return QStringLiteral("unknown-sort-key");
     case JobNote::Kind::UnshownCharacter: return QStringLiteral("unshown-character");
+    case JobNote::Kind::NotInTotal: return QStringLiteral("not-in-total");
     case JobNote::Kind::Difference: return QStringLiteral("difference");
     case JobNote::Kind::PassedOver: return QStringLiteral("passed-over");
     case JobNote::Kind::AssumedUnit: return QStringLiteral("assumed-unit");

@@ -26,6 +26,7 @@ struct JobNote
         BlankValue, ///< numbers that are not there and show as blanks, as the job asks for: for the file of notes alone
         NotFinite,  ///< values that are infinite or not-a-number
         UnknownSortKey, ///< a sort key of a table that is in no dictionary, so that the rows are sorted by another one
+        NotInTotal,     ///< values that are missing, infinite or not-a-number, so that they are in no total
         UnshownCharacter, ///< a character of the report that an output cannot show
         Difference,       ///< what does not fit together in the data itself
         PassedOver,       ///< what a data file holds and no list reads: said, but no mistake of anybody

@@ -75,6 +75,23 @@ ValueSentences blankSentences()
               "%5, line %6 of the report")};
 }
 
+ValueSentences missingInTotals()
+{
+    return {
+        Xlate("%1 value of the variable \"%2\" is missing and in no total of the table \"%3\", in row %4"),
+        Xlate(
+            "%1 values of the variable \"%2\" are missing and in no total of the table \"%3\", the first one in row %4")};
+}
+
+ValueSentences infiniteInTotals()
+{
+    return {
+        Xlate("%1 value of the variable \"%2\" is infinite or not a number and in no total of the table \"%3\", in row "
+              "%4"),
+        Xlate("%1 values of the variable \"%2\" are infinite or not a number and in no total of the table \"%3\", the "
+              "first one in row %4")};
+}
+
 } // namespace
 
 /// Something about a variable that a table or block names, with its place in the template; the step has one anyway.
@@ -205,6 +222,34 @@ JobSteps::Wrong JobSteps::noteValue(const ColumnRemarks &column, bool isRead, Ro
     if (isRead) {
         note(Kind::MissingValue, column.missing, zeroSentences());
         note(Kind::BlankValue, column.blank, blankSentences());
+    }
+    return wrong;
+}
+
+/// Notes which values are in no total of a table that was written.
+JobSteps::Wrong JobSteps::noteLeftOut(ShownRows &rows, const WrittenRecord &record)
+{
+    Wrong wrong;
+    const auto note = [&](const QString &variable, quint64 count, quint64 firstRow, const ValueSentences &sentences) {
+        if (count == 0) {
+            return;
+        }
+        const QString text = (count == 1 ? sentences.one : sentences.several)
+                                 .arg(QString::number(count), variable, record.name, QString::number(firstRow));
+        JobNote found = {JobNote::Kind::NotInTotal, source_.errorAt(record.path, text), 0, count, firstRow};
+        const auto place = rows.placeOf(static_cast<std::size_t>(firstRow) - 1, variable);
+        found.dataFile = place.file;
+        found.dataPlace = place.place;
+        wrong = firstOf(wrong, notes_.add({found}));
+    };
+    const auto &variables = rows.groups().variables;
+    for (std::size_t i = 0; i < rows.leftOut().size(); ++i) {
+        const LeftOut &out = rows.leftOut()[i];
+        if (variables[i].isAdded) {
+            const QString &name = variables[i].field.VariableName;
+            note(name, out.missing, out.firstMissing, missingInTotals());
+            note(name, out.notFinite, out.firstNotFinite, infiniteInTotals());
+        }
     }
     return wrong;
 }

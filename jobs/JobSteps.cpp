@@ -3,6 +3,7 @@
 #include "NearestName.h"
 #include "PageMark.h"
 #include "ReportOutline.h"
+#include "ShapeBinding.h"
 #include "TemplateCheck.h"
 #include "UXmlReportTpl.h"
 #include "Xlate.h"
@@ -132,11 +133,16 @@ JobSteps::Wrong JobSteps::write(const Job::Table &step, const JsonPath &path)
     if (auto wrong = wrongRecord(*table, Xlate("table"), step.name, path)) {
         return wrong;
     }
-    const auto opened = openRows(step.data, table->Use, false);
+    auto opened = openRows(step.data, table->Use, false);
     if (const InputError *error = errorOf(opened)) {
         return *error;
     }
-    RowList &rows = *std::get<std::unique_ptr<RowList>>(opened);
+    auto &list = std::get<std::unique_ptr<RowList>>(opened);
+    const auto shaped = shape(list, step, *table);
+    if (const InputError *error = errorOf(shaped)) {
+        return *error;
+    }
+    RowList &rows = *list;
     const WrittenRecord record = {Xlate("table"), TemplatePart::Table, step.name, table->Use, table->Fields, path};
     // Columns that are known already are looked at before hundreds of thousands of rows are.
     auto columns = rows.columns();
@@ -164,7 +170,36 @@ JobSteps::Wrong JobSteps::write(const Job::Table &step, const JsonPath &path)
     }
     auto wrong = noteSource(rows);
     auto other = noteValues(rows, columns, record);
+    wrong = wrong ? wrong : other;
+    if (ShownRows *const shown = std::get<ShownRows *>(shaped)) {
+        other = noteLeftOut(*shown, record);
+    }
     return wrong ? wrong : other;
+}
+
+/// Has rows shown as a step asks for it. @return null where it asks for nothing
+Expected<ShownRows *> JobSteps::shape(std::unique_ptr<RowList> &rows, const Job::Table &step,
+                                      const sXmlReportTable &table)
+{
+    if (step.shape.isEmpty()) {
+        return static_cast<ShownRows *>(nullptr);
+    }
+    const ShapeSurroundings surroundings = {source_, *report_.GetTemplate(), table, units_, job_.settings};
+    auto bound = bindShape(step.shape, surroundings);
+    if (const InputError *error = errorOf(bound)) {
+        return *error;
+    }
+    auto &[shape, sortIds] = std::get<BoundShape>(bound);
+    auto shown = std::make_unique<ShownRows>(std::move(rows), std::move(shape));
+    ShownRows *const list = shown.get();
+    rows = std::move(shown);
+    if (!sortIds.empty()) {
+        list->Sort(sortIds);
+        if (const auto error = list->error()) {
+            return *error;
+        }
+    }
+    return list;
 }
 
 JobSteps::Wrong JobSteps::noSuchRecord(const QString &what, const QString &name, const QStringList &names,
@@ -235,7 +270,8 @@ JobSteps::Wrong JobSteps::wrongRecord(const Record &record, const QString &what,
 Expected<std::unique_ptr<RowList>> JobSteps::openRows(const QString &data, const QString &dictionary, bool firstOnly)
 {
     const UXmlReportTpl *tpl = report_.GetTemplate();
-    const JobData::VariablesIn variablesIn = [tpl, dictionary](const DataUnits &units) {
+    const JobData::VariablesIn variablesIn = [this, tpl, dictionary](const DataUnits &units) {
+        units_ = units;
         Variables variables;
         variables.find = [tpl, units, dictionary](const QString &variable) -> std::optional<ValueParser> {
             qint32 id = 0;

@@ -7,6 +7,7 @@
 #include "JsonSource.h"
 #include "Placeholders.h"
 #include "ResultOutputs.h"
+#include "ShownRows.h"
 #include "StepFit.h"
 #include "TemplatePlaces.h"
 #include "UReportDoc.h"
@@ -79,6 +80,8 @@ private:
     Wrong noteField(const UnfilledField &field, const WrittenRecord &record);
     Wrong noteSortKeys(const WrittenRecord &record);
     Wrong noteSource(const RowList &rows);
+    Wrong noteLeftOut(ShownRows &rows, const WrittenRecord &record);
+    Expected<ShownRows *> shape(std::unique_ptr<RowList> &rows, const Job::Table &step, const sXmlReportTable &table);
     QString shownText(const QString &text) const;
     void addResultText(ResultText kind, QString text, int style);
     void describeResults(const QString &data, const QString &dictionary, const sXmlSortTableReport *sort);
@@ -102,6 +105,7 @@ private:
         places_; ///< of the template; null until one is asked for, and where it cannot be read
     bool arePlacesRead_ = false;
     QSet<QString> notedUnits_; ///< data sets and keys of units
+    DataUnits units_;          ///< of the data that was opened last
 };
 
 } // namespace kareport

@@ -2,6 +2,7 @@
 
 #include "NearestName.h"
 #include "Placeholders.h"
+#include "TableShapeReader.h"
 #include "Xlate.h"
 
 #include <limits>
@@ -57,9 +58,13 @@ std::optional<Job::Step> readStep(const JsonNode &node)
                     Job::Block{node["block"].text(), node["data"].text(), before, readLines(node["after"], 0)});
     }
     if (node["table"].exists()) {
-        node.allowOnly({"table", "data", "before", "after", "headingAfter"});
+        QStringList keys;
+        for (const char *key : {"table", "data", "before", "after", "headingAfter"}) {
+            keys.append(QLatin1StringView(key));
+        }
+        node.allowOnly(keys + tableShapeKeys());
         return step("table", Job::Table{node["table"].text(), node["data"].text(), before, readLines(node["after"], 0),
-                                        readLines(node["headingAfter"], -1)});
+                                        readLines(node["headingAfter"], -1), readTableShape(node)});
     }
     if (node["clear"].exists()) {
         node.allowOnly({"clear"});

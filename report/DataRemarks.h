@@ -5,6 +5,7 @@
 #include <QString>
 #include <QtGlobal>
 
+#include <utility>
 #include <vector>
 
 namespace kareport
@@ -60,6 +61,25 @@ struct DataRemarks
         if (hasNew_) {
             giveLine(line);
         }
+    }
+    /// Whether `setLine` is waited for; it is not any more then, and `setLineOf` may come after other rows.
+    bool takeNew() { return std::exchange(hasNew_, false); }
+    /// Says which line of the report a row is in. @param row  from 1
+    void setLineOf(quint64 row, qint64 line)
+    {
+        for (ColumnRemarks &column : columns) {
+            for (ValueCount *count : {&column.tooWide, &column.missing, &column.blank, &column.notFinite}) {
+                count->firstLine = count->firstRow == row && count->firstLine == 0 ? line : count->firstLine;
+            }
+            column.widestLine = column.widestRow == row && column.widestLine == 0 ? line : column.widestLine;
+        }
+    }
+
+    /// Gives a line to everything that has none.
+    void setMissingLines(qint64 line)
+    {
+        hasNew_ = true;
+        setLine(line);
     }
 
 private:

@@ -1,6 +1,9 @@
 #include "DataWriter.h"
 
+#include "GroupedTable.h"
 #include "WideVectors.h"
+
+#include <algorithm>
 
 namespace kareport
 {
@@ -10,6 +13,7 @@ namespace
 
 /// A heading of a table needs this many lines and one more for a row.
 constexpr int headingRoom = 3;
+constexpr int linesOfName = 3; ///< a table's name with a blank line before and after it
 constexpr int usualHeadingLinesAfter = 2;
 
 const PageHeading noHeading = {QString(), 0, usualHeadingLinesAfter};
@@ -134,27 +138,39 @@ void DataWriter::writeTable(const UXmlReportTable &table, UDataObjectList &list,
     }
     const int linesAfter = layout.headingLinesAfter == -1 ? usualHeadingLinesAfter : layout.headingLinesAfter;
     page_.setHeading({withChainageLabel(table.GetHeading(), layout.chainageLabel), 0, linesAfter});
-    if (!page_.heading().text.isEmpty()) {
-        placeHeading(table, layout.writeName);
+    auto *groups = dynamic_cast<GroupedList *>(&list);
+    const bool isGrouped = groups != nullptr && !groups->groups().isEmpty();
+    if (!isGrouped) {
+        placeHeading(table, layout.writeName, 0);
     }
     DataRemarks unwanted;
     DataRemarks &remarks = layout.remarks != nullptr ? *layout.remarks : unwanted;
     remarks = remarksFor(table, remarks);
     feed_.beginTable(table, layout.chainageLabel);
-    writeRows(table, list, remarks);
+    if (isGrouped) {
+        writeGroups(table, list, *groups, layout.writeName, remarks);
+    } else {
+        writeRows(table, list, remarks);
+    }
     feed_.endTable();
     endOutput(layout.linesAfter);
 }
 
 /// At a page's start the header brings the heading with it. Without headers the heading is then not written at all,
 /// which hosts that lay out their own pages count on.
-void DataWriter::placeHeading(const UXmlReportTable &table, bool writeName)
+/// @param lines  that stay with the heading, where a page can hold as many; 0 where nobody has counted
+void DataWriter::placeHeading(const UXmlReportTable &table, bool writeName, qint64 lines)
 {
+    if (page_.heading().text.isEmpty()) {
+        return;
+    }
     if (page_.lineCount() == 0) {
         page_.beginFirstPage();
         return;
     }
-    if (page_.linesLeft() <= headingRoom) {
+    const qint64 needed = std::max(page_.heading().linesAfter, 0) + (writeName ? linesOfName : 0) + lines;
+    const bool isApart = lines > 0 && page_.linesLeft() < needed && needed < page_.linesPerPage();
+    if (page_.linesLeft() <= headingRoom || isApart) {
         page_.breakPage();
         return;
     }
@@ -192,6 +208,28 @@ void DataWriter::writeRows(const UXmlReportTable &table, UDataObjectList &list, 
         page_.setHeading(noHeading);
         page_.writeLine(QStringView(), 0, 1, 0);
         remarks.setLine(page_.lineCount());
+    }
+}
+
+/// The heading is not placed before it is known how many lines stay with it.
+void DataWriter::writeGroups(const UXmlReportTable &table, UDataObjectList &list, GroupedList &groups, bool writeName,
+                             DataRemarks &remarks)
+{
+    const std::vector<FieldFormatter> fields = formattersOf(table);
+    bool isPlaced = false;
+    const auto placeOnce = [&](qint64 lines) {
+        isPlaced = true;
+        placeHeading(table, writeName, lines);
+    };
+    GroupedTable grouped(page_, options_, table, groups, remarks);
+    grouped.write({list,
+                   [&](const UDataObject &object, quint64 row) {
+                       formatRow(fields, object, row, remarks);
+                       return row_.view();
+                   },
+                   placeOnce});
+    if (!isPlaced) {
+        placeOnce(0);
     }
 }
 

@@ -2,6 +2,7 @@
 
 #include "DataRemarks.h"
 #include "FieldFormatter.h"
+#include "GroupedList.h"
 #include "PageWriter.h"
 #include "ResultFeed.h"
 #include "UDataObjectList.h"
@@ -38,8 +39,10 @@ public:
     void writeTable(const UXmlReportTable &table, UDataObjectList &list, const TableLayout &layout);
 
 private:
-    void placeHeading(const UXmlReportTable &table, bool writeName);
+    void placeHeading(const UXmlReportTable &table, bool writeName, qint64 lines);
     void writeRows(const UXmlReportTable &table, UDataObjectList &list, DataRemarks &remarks);
+    void writeGroups(const UXmlReportTable &table, UDataObjectList &list, GroupedList &groups, bool writeName,
+                     DataRemarks &remarks);
     void formatRow(const std::vector<FieldFormatter> &fields, const UDataObject &object, quint64 row,
                    DataRemarks &remarks);
     void endOutput(int linesAfter);

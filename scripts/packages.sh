@@ -62,7 +62,7 @@ packages_bench=(
 packages_compare=(
     python3                 # runs the programs and writes the page
     python3-matplotlib      # its pictures
-    mawk gawk sqlite3 miller # rows to text
+    mawk gawk sqlite3 miller datamash # rows to text, and their groups
     python3-openpyxl        # rows to a workbook
     xsltproc                # points of a LandXML file to text
     postgresql              # rows from a database server

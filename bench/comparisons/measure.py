@@ -9,8 +9,9 @@ import time
 
 @dataclasses.dataclass
 class Command:
-    """A program with its arguments; `output` receives its standard output, `own_clock` is for one that prints its own
-    seconds and peak kilobytes. One that runs longer than `most_seconds` is stopped, and counts as not finished."""
+    """A program with its arguments; `input` is its standard input, `output` receives what it prints, `own_clock` is for one
+    that prints its own seconds and peak kilobytes. One that runs longer than `most_seconds` is stopped, and counts as not
+    finished."""
     name: str
     arguments: list
     output: str | None = None
@@ -20,6 +21,7 @@ class Command:
     ours: bool = False
     bound: bool = False  # no program for this work, but what the work can take at the least
     processor_time: bool = False  # seconds of the processor in the place of those of the clock
+    input: str | None = None
 
 
 @dataclasses.dataclass
@@ -41,9 +43,10 @@ def run(command, folder):
     """Seconds and peak kilobytes of one run; nothing when it did not finish."""
     log = os.path.join(folder, "stderr.log")
     environment = {**os.environ, **command.environment}
-    with open(command.output or os.devnull, "wb") as out, open(log, "wb") as err:
+    with open(command.output or os.devnull, "wb") as out, open(log, "wb") as err, \
+            open(command.input or os.devnull, "rb") as given:
         begin = time.perf_counter()
-        process = subprocess.Popen(command.arguments, cwd=folder, env=environment, stdin=subprocess.DEVNULL,
+        process = subprocess.Popen(command.arguments, cwd=folder, env=environment, stdin=given,
                                    stdout=subprocess.PIPE if command.own_clock else out, stderr=err,
                                    start_new_session=True)
         printed = process.stdout.read() if command.own_clock else b""

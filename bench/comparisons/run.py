@@ -12,7 +12,7 @@ from measure import Result
 from work import Comparison, Limit, Surroundings
 
 HERE = os.path.dirname(os.path.abspath(__file__))
-WORKS = ["rows", "results", "data", "pages", "report_file", "viewer", "long_report", "rich_text", "templates", "landxml", "batch", "stopping", "parts"]
+WORKS = ["rows", "groups", "results", "data", "pages", "report_file", "viewer", "long_report", "rich_text", "templates", "landxml", "batch", "stopping", "parts"]
 
 
 def kept_path(folder, work):

@@ -1,0 +1,8 @@
+#include "GroupedList.h"
+
+namespace kareport
+{
+
+GroupedList::~GroupedList() = default;
+
+} // namespace kareport

@@ -1,0 +1,68 @@
+#include "ConditionBinding.h"
+
+#include "Measures.h"
+#include "Xlate.h"
+
+namespace kareport
+{
+
+namespace
+{
+
+void bindLimit(RowCondition &bound, const TableShape::Condition &condition, const FoundVariable &of,
+               VariableLookup &lookup)
+{
+    if (!isNumeric(of.type)) {
+        lookup.fail(condition.of.path, Xlate("values of the variable \"%1\" are no numbers").arg(of.name));
+        return;
+    }
+    const auto limit = lookup.valueOf(of, condition.values.front());
+    if (!limit) {
+        return;
+    }
+    bound.limit = numberOf(&*limit).value_or(0);
+    if (bound.kind == RowCondition::Kind::Outside && !(bound.limit >= 0)) {
+        lookup.fail(condition.values.front().path, Xlate("a tolerance from 0 on was expected"));
+    }
+    if (!condition.beside) {
+        return;
+    }
+    const FoundVariable beside = lookup.find(*condition.beside);
+    if (!lookup.error() && measureOf(beside.type) != measureOf(of.type)) {
+        lookup.fail(condition.beside->path,
+                    Xlate("\"%1\" and \"%2\" cannot be compared: they have different units").arg(of.name, beside.name));
+    }
+    bound.beside = beside.id;
+}
+
+} // namespace
+
+RowCondition bindCondition(const TableShape::Condition &condition, VariableLookup &lookup)
+{
+    using Kind = RowCondition::Kind;
+    RowCondition bound;
+    const FoundVariable of = lookup.find(condition.of);
+    if (lookup.error()) {
+        return bound;
+    }
+    bound.id = of.id;
+    bound.reader = of.reader;
+    if (condition.kind == u"exists") {
+        bound.kind = condition.values.front().value.toBool() ? Kind::Exists : Kind::Missing;
+        return bound;
+    }
+    if (condition.kind.startsWith(u"is")) {
+        bound.kind = condition.kind == u"is" ? Kind::Is : Kind::IsNot;
+        for (const TableShape::Value &value : condition.values) {
+            if (const auto entry = lookup.valueOf(of, value)) {
+                bound.values.push_back(*entry);
+            }
+        }
+        return bound;
+    }
+    bound.kind = condition.kind == u"above" ? Kind::Above : condition.kind == u"below" ? Kind::Below : Kind::Outside;
+    bindLimit(bound, condition, of, lookup);
+    return bound;
+}
+
+} // namespace kareport

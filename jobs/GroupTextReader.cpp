@@ -1,0 +1,126 @@
+#include "GroupTextReader.h"
+
+#include "NearestName.h"
+#include "TextFolding.h"
+#include "UnitFactors.h"
+#include "Xlate.h"
+
+#include <algorithm>
+#include <optional>
+
+namespace kareport
+{
+
+namespace
+{
+
+using Piece = GroupText::Piece;
+
+constexpr qsizetype longestQuote = 40;
+
+Piece textPiece(const QString &text)
+{
+    Piece piece;
+    piece.text = text;
+    return piece;
+}
+
+std::optional<QString> unitOf(QStringView name, const UJobSettings &settings)
+{
+    if (name == u"lengthUnit") {
+        return nameOf(settings.lengthUnit).toString();
+    }
+    if (name == u"areaUnit") {
+        return nameOf(settings.areaUnit).toString();
+    }
+    return name == u"angleUnit" ? std::optional(nameOf(settings.angleUnit).toString()) : std::nullopt;
+}
+
+QStringList expectedNames(const std::vector<FoundVariable> &by)
+{
+    QStringList names;
+    for (const FoundVariable &variable : by) {
+        names.append(u'{' + variable.name + u'}');
+    }
+    for (const char *name : {"{count}", "{sum:...}", "{mean:...}", "{min:...}", "{max:...}", "{count:...}",
+                             "{lengthUnit}", "{areaUnit}", "{angleUnit}"})
+    {
+        names.append(QLatin1StringView(name));
+    }
+    return names;
+}
+
+/// The piece that a placeholder stands for; nothing for one that is not known.
+std::optional<Piece> placeholderOf(const QString &name, const JsonPath &path, const std::vector<FoundVariable> &by,
+                                   const TotalIndex &indexOf, VariableLookup &lookup)
+{
+    Piece piece;
+    const auto variable =
+        std::find_if(by.begin(), by.end(), [&](const FoundVariable &other) { return equalFolded(other.name, name); });
+    if (variable != by.end()) {
+        piece.kind = Piece::Kind::Value;
+        piece.field = lookup.fieldOf(*variable);
+        piece.field.Width = 0;
+        return piece;
+    }
+    if (name == u"count") {
+        piece.kind = Piece::Kind::Rows;
+        return piece;
+    }
+    if (const auto unit = unitOf(name, lookup.surroundings().settings)) {
+        return textPiece(*unit);
+    }
+    const QString kind = name.section(u':', 0, 0);
+    for (const char *known : {"sum", "mean", "min", "max", "count"}) {
+        if (name.contains(u':') && kind == QLatin1StringView(known)) {
+            piece.kind = Piece::Kind::Total;
+            piece.total = indexOf(kind, {name.section(u':', 1), path});
+            return piece;
+        }
+    }
+    return std::nullopt;
+}
+
+} // namespace
+
+GroupText readGroupText(const TableShape::Name &text, const std::vector<FoundVariable> &by, const TotalIndex &indexOf,
+                        VariableLookup &lookup)
+{
+    GroupText read;
+    const QString &all = text.text;
+    for (qsizetype at = 0; at < all.size();) {
+        const qsizetype brace = all.indexOf(u'{', at);
+        if (brace != at) {
+            const qsizetype end = brace < 0 ? all.size() : brace;
+            read.pieces.push_back(textPiece(all.sliced(at, end - at)));
+            at = end;
+            continue;
+        }
+        if (all.sliced(at + 1).startsWith(u'{')) {
+            read.pieces.push_back(textPiece(QStringLiteral("{")));
+            at += 2;
+            continue;
+        }
+        const qsizetype end = all.indexOf(u'}', at);
+        if (end < 0) {
+            lookup.fail(
+                text.path,
+                Xlate("\"%1\" begins a placeholder that does not end: \"}\" was expected, or \"{{\" for a brace")
+                    .arg(shortened(all.sliced(at), longestQuote)));
+            break;
+        }
+        const QString name = all.sliced(at + 1, end - at - 1);
+        const auto piece = placeholderOf(name, text.path, by, indexOf, lookup);
+        if (!piece) {
+            const QString braced = u'{' + shortened(name, longestQuote) + u'}';
+            lookup.fail(text.path,
+                        Xlate("unknown placeholder %1: %2").arg(braced, oneOfExpected(braced, expectedNames(by))));
+            break;
+        }
+        read.pieces.push_back(*piece);
+        at = end + 1;
+    }
+    return read;
+}
+
+} // namespace kareport

@@ -1,0 +1,31 @@
+#pragma once
+
+#include "UDictEntry.h"
+
+#include <optional>
+
+namespace kareport
+{
+
+/// What the values of a type measure. Only values of one measure are added to and compared with each other.
+enum class Measure
+{
+    Number, ///< without a unit
+    Length,
+    Area,
+    Angle,
+    Thickness, ///< some of its numbers are no numbers
+    Truth,
+    Text
+};
+
+Measure measureOf(int type);
+/// Whether values of a type have an order of numbers.
+bool isNumeric(int type);
+/// Whether values of a type can be added up: a sum of directions says nothing.
+bool isAdded(int type);
+
+/// The number that an entry holds; nothing for null and for any other value.
+std::optional<double> numberOf(const UDictEntry *entry);
+
+} // namespace kareport

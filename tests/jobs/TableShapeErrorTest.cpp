@@ -1,0 +1,153 @@
+#include "JobRunnerFixture.h"
+
+#include <gtest/gtest.h>
+
+namespace
+{
+
+using jobs::TestJob;
+
+QByteArray pointsWithLengths()
+{
+    using namespace markup;
+    const std::vector<QByteArray> fields = {field("Number", "Pt", "5"), field("Northing", "North", "9.3", "RIGHT"),
+                                            field("Note", "Note", "5")};
+    const QByteArray tables =
+        output("Table", "Points", "Survey", fields) + output("Table", "Sorted", "Survey", fields, {"Note", "Number"});
+    const QByteArray dictionary = element(
+        "Dictionary",
+        element("DictionaryName", "Survey") +
+            element("VariableList", joined({variable(1, "Number", "NUMBER"), variable(2, "Northing", "COORDINATE"),
+                                            variable(3, "Easting", "COORDINATE"), variable(4, "Area", "AREA"),
+                                            variable(5, "Note", "TEXT"), variable(6, "Count", "INTEGER"),
+                                            variable(7, "Bearing", "BEARING"), variable(8, "Mark", "FLAG"),
+                                            variable(9, "Thickness", "THICKNESS")})));
+    return element("ReportTemplate", element("Name", "T") + element("Title", "Title") + element("Tables", tables) +
+                                         element("Dictionaries", dictionary) +
+                                         element("Options", separatorOption("124")));
+}
+
+TEST(TableShapeError, HasItsPlaceAndSaysWhatWasExpected)
+{
+    const struct
+    {
+        const char *keys;
+        const char *about; ///< the text at the place of the error
+        const char *error;
+    } rows[] = {
+        {R"("group": [])", R"("group")",
+         "unknown key \"group\": table, data, before, after, headingAfter, sort, where, "
+         "compute, running, flags, groups, totals, pageTotals, rounding expected; did you mean \"groups\"?"},
+        {R"("groups": {})", "{}", "a list was expected"},
+        {R"("groups": [{"heading": "x"}])", R"({"heading")", "the name of a variable was expected"},
+        {R"("groups": [{"by": []}])", "[]", "the name of a variable was expected"},
+        {R"("groups": [{"by": "Note", "keep": 0, "heading": "x"}])", "0", "a whole number from 1 to 1000 was expected"},
+        {R"("groups": [{"by": "Note", "keep": 2}])", "2",
+         "\"keep\" goes with a heading: the key \"heading\" was expected"},
+        {R"("groups": [{"by": "Note", "by2": 1}])", R"("by2")",
+         "unknown key \"by2\": by, heading, totals, before, keep, newPage expected; did you mean \"by\"?"},
+        {R"("groups": [{"by": "Nite"}])", R"("Nite")",
+         "the dictionary \"Survey\" has no variable \"Nite\": one of Number, Northing, Easting, Area, Note, Count, Bearing, Mark, Thickness was expected; did you mean \"Note\"?"},
+        {R"("groups": [{"by": "Note"}])", R"("Note")",
+         "groups by \"Note\" need rows that are sorted by them first: the key \"sort\" was expected in the step"},
+        {R"("sort": ["Number", "Note"], "groups": [{"by": "Note"}])", R"("Note"}])",
+         "groups by \"Note\" need rows that are sorted by them first: they are sorted by \"Number\", \"Note\""},
+        {R"("sort": "Note", "groups": [{"by": "Note"}, {"by": "Number"}])", R"("Note"}, )",
+         "groups by \"Note\", \"Number\" need rows that are sorted by them first: they are sorted by \"Note\""},
+        {R"("sort": "Note", "groups": [{"by": "Note", "heading": "{Nite}"}])", R"("{Nite}")",
+         "unknown placeholder {Nite}: one of {Note}, {count}, {sum:...}, {mean:...}, {min:...}, {max:...}, {count:...}, {lengthUnit}, {areaUnit}, {angleUnit} was expected; did you mean \"{Note}\"?"},
+        {R"("sort": "Note", "groups": [{"by": "Note", "heading": "a {Note"}])", R"("a {Note")",
+         "\"{Note\" begins a placeholder that does not end: \"}\" was expected, or \"{{\" for a brace"},
+        {R"("sort": "Note", "groups": [{"by": "Note", "heading": "{sum:Note}"}])", R"("{sum:Note}")",
+         "values of the variable \"Note\" cannot be added up: a number, a length, an area or an angle was expected, or \"count\""},
+        {R"("totals": [{"sum": "Note"}])", R"("Note")",
+         "values of the variable \"Note\" cannot be added up: a number, a length, an area or an angle was expected, or \"count\""},
+        {R"("totals": [{"mean": "Bearing"}])", R"("Bearing")",
+         "values of the variable \"Bearing\" cannot be added up: a number, a length, an area or an angle was expected, or \"count\""},
+        {R"("totals": [{"max": "Thickness"}])", R"("Thickness")",
+         "values of the variable \"Thickness\" cannot be added up: a number, a length, an area or an angle was expected, or \"count\""},
+        {R"("totals": [{"sum": "Area"}])", R"("Area")", "the table \"Points\" has no column \"Area\" for a total"},
+        {R"("totals": [{"sum": "Northing", "max": "Northing"}])", R"("Northing"}])",
+         "the column \"Northing\" has a total already: another line was expected for a second one"},
+        {R"("totals": [{}])", "{}", "one of label, sum, mean, min, max, count was expected"},
+        {R"("totals": [{"label": "{Number}"}])", R"("{Number}")",
+         "unknown placeholder {Number}: one of {count}, {sum:...}, {mean:...}, {min:...}, {max:...}, {count:...}, {lengthUnit}, {areaUnit}, {angleUnit} was expected"},
+        {R"("rounding": "up", "totals": [])", R"("up")", "one of exact, printed was expected"},
+        {R"("where": [{"of": "Northing"}])", R"({"of")",
+         "one of is, isNot, above, below, outside, exists was expected"},
+        {R"("where": [{"of": "Northing", "above": 1, "below": 2}])", "2",
+         "one of is, isNot, above, below, outside, exists was expected, not two"},
+        {R"("where": [{"of": "Northing", "above": "high"}])", R"("high")",
+         "a number was expected, as the variable \"Northing\" has it"},
+        {R"("where": [{"of": "Note", "above": 1}])", R"("Note")", "values of the variable \"Note\" are no numbers"},
+        {R"("where": [{"of": "Northing", "outside": -1}])", "-1", "a tolerance from 0 on was expected"},
+        {R"("where": [{"of": "Northing", "above": 1, "beside": "Area"}])", R"("Area")",
+         "\"Northing\" and \"Area\" cannot be compared: they have different units"},
+        {R"("where": [{"of": "Note", "is": "x", "beside": "Note"}])", R"("Note"}])",
+         "\"beside\" goes with above, below and outside alone"},
+        {R"("compute": [{"variable": "Area", "sum": ["Northing", "Easting"]}])", R"("Area")",
+         "the variable \"Area\" cannot take that: one of the same measure was expected, such as a length for lengths"},
+        {R"("compute": [{"variable": "Area", "sum": ["Northing", "Area"]}])", R"("Area"]}])",
+         "a variable cannot be computed of itself"},
+        {R"("compute": [{"variable": "Northing", "sum": ["Easting", "Area"]}])", R"({"variable")",
+         "the variables do not go together: those of one measure were expected, such as lengths, or a product of two lengths or of a number"},
+        {R"("compute": [{"variable": "Northing", "difference": ["Easting"]}])", "[\"Easting\"",
+         "two variables were expected"},
+        {R"("compute": [{"variable": "Northing", "sum": ["Note", "Easting"]}])", R"("Note")",
+         "values of the variable \"Note\" are no numbers"},
+        {R"("running": [{"variable": "Easting", "sum": "Northing", "per": "page"}])", R"("page")",
+         "one of table, group was expected"},
+        {R"("running": [{"variable": "Easting", "sum": "Northing", "per": "group"}])", R"({"variable")",
+         "\"per\": \"group\" goes with groups: the key \"groups\" was expected in the step"},
+        {R"("running": [{"variable": "Area", "rowNumber": true}])", R"("Area")",
+         "the variable \"Area\" cannot take that: one of the same measure was expected, such as a length for lengths"},
+        {R"("flags": [{"variable": "Area", "text": "!", "of": "Northing", "above": 1}])", R"("Area")",
+         "a flag needs a text, or a mark: the variable \"Area\" is neither"},
+        {R"("flags": [{"variable": "Note", "of": "Northing", "above": 1}])", R"({"variable")",
+         "the key \"text\" with the text of the flag was expected"},
+        {R"("flags": [{"variable": "Mark", "text": "!", "of": "Northing", "above": 1}])", R"("!")",
+         "the variable \"Mark\" has a mark and no text"},
+        {R"("compute": [{"variable": "Easting", "sum": ["Northing", "Northing"]}], "sort": "Easting")", R"("Easting"})",
+         "rows are sorted before \"Easting\" is computed: a variable of the data was expected"},
+    };
+    for (const auto &row : rows) {
+        TestJob test;
+        test.folder.put("t.xml", pointsWithLengths());
+        const QByteArray before = R"({"table": "Points", "data": "p", )";
+        const QByteArray content =
+            jobs::templateJob(R"("p": {"values": [{"Number": "1", "Northing": 12.5}]})", before + row.keys + '}');
+        test.run(content);
+        ASSERT_TRUE(test.error) << row.keys;
+        EXPECT_EQ(test.error->text.toStdString(), row.error) << row.keys;
+        const QByteArray whole = jobs::fixedFront + content + '}';
+        const qsizetype step = whole.indexOf(before) + before.size();
+        const qsizetype about = whole.indexOf(row.about, step);
+        ASSERT_GE(about, 0) << row.about;
+        ASSERT_TRUE(test.error->place) << row.keys;
+        EXPECT_EQ(whole.lastIndexOf('\n', about), -1);
+        EXPECT_EQ(test.error->place->column, about + 1) << row.keys;
+    }
+}
+
+TEST(TableShapeError, ATableThatTheTemplateSortsIsNotSortedAgain)
+{
+    TestJob test;
+    test.folder.put("t.xml", pointsWithLengths());
+    test.run(jobs::templateJob(R"("p": {"values": []})", R"({"table": "Sorted", "data": "p", "sort": "Number"})"));
+    ASSERT_TRUE(test.error);
+    EXPECT_EQ(test.error->text,
+              QStringLiteral("the template sorts the table \"Sorted\": \"sort\" is for tables that it does not sort"));
+}
+
+TEST(TableShapeError, WhatTheTemplateSortsByIsNotSet)
+{
+    TestJob test;
+    test.folder.put("t.xml", pointsWithLengths());
+    test.run(jobs::templateJob(R"("p": {"values": []})", R"({"table": "Sorted", "data": "p",
+        "flags": [{"variable": "Note", "text": "!", "of": "Northing", "above": 1}], "groups": [{"by": "Note"}]})"));
+    ASSERT_TRUE(test.error);
+    EXPECT_EQ(test.error->text,
+              QStringLiteral("rows are sorted before \"Note\" is computed: a variable of the data was expected"));
+}
+
+} // namespace
