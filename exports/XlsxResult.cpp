@@ -208,8 +208,18 @@ void XlsxResult::writeCell(const Column &column, lxw_col_t at, const ResultCell 
             XlsxBook::writeNumber(table_.sheet, table_.nextRow, at, number->value, format);
             return;
         }
-        if (cell.value == nullptr) {
-            return; // the report may show a zero for what is missing; a calculation must not
+        if (cell.value == nullptr) { // the report may show a zero for what is missing; a calculation must not
+            bool isCount = false;
+            const qlonglong count = cell.text.toLongLong(&isCount);
+            if (isTotal && isCount) {
+                CellLook look = column.look;
+                look.numberFormat = "0";
+                look.isBold = true;
+                look.hasRule = true;
+                XlsxBook::writeNumber(table_.sheet, table_.nextRow, at, static_cast<double>(count),
+                                      book_->formatOf(look));
+            }
+            return;
         }
     }
     if (!cell.text.isEmpty()) {

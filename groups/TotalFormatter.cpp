@@ -204,6 +204,19 @@ TotalledCell::Value TotalledCell::read(const UDictEntry *entry)
     return {State::Number, *value, number};
 }
 
+std::optional<double> TotalledCell::internal(const ColumnTotal &total, TotalKind kind) const
+{
+    if (kind == TotalKind::Count || (total.count == 0 && kind != TotalKind::Sum)) {
+        return std::nullopt;
+    }
+    if (kind == TotalKind::Least || kind == TotalKind::Greatest) {
+        return kind == TotalKind::Least ? total.least : total.greatest;
+    }
+    const double sum = total.sum.toDouble();
+    const double number = kind == TotalKind::Mean ? sum / static_cast<double>(total.count) : sum;
+    return addsPrinted_ ? number / shown(1) : number * reader_.factor();
+}
+
 void TotalledCell::add(ColumnTotal &total, const Value &value) const
 {
     switch (value.state) {

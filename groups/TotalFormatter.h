@@ -8,6 +8,8 @@
 
 #include <QStringView>
 
+#include <optional>
+
 namespace kareport
 {
 
@@ -68,6 +70,8 @@ public:
     };
     Value read(const UDictEntry *entry);
     void add(ColumnTotal &total, const Value &value) const;
+    /// A total as an internal value. Nothing for a count, and where there is no value.
+    std::optional<double> internal(const ColumnTotal &total, TotalKind kind) const;
 
 private:
     double shown(double value) const;

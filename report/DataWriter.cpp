@@ -221,7 +221,13 @@ void DataWriter::writeGroups(const UXmlReportTable &table, UDataObjectList &list
         isPlaced = true;
         placeHeading(table, writeName, lines);
     };
+    GroupResults results(feed_, [&](const UDataObject &object) {
+        DataRemarks unused = remarksFor(table, DataRemarks());
+        formatRow(fields, object, 0, unused);
+        feed_.endRow(object);
+    });
     GroupedTable grouped(page_, options_, table, groups, remarks);
+    grouped.giveResults(results);
     grouped.write({list,
                    [&](const UDataObject &object, quint64 row) {
                        formatRow(fields, object, row, remarks);

@@ -76,9 +76,13 @@ void GroupedTable::write(const Rows &rows)
         }
         beginGroups(first, *object);
         addRow(*object, rows.textOf(*object, row), row);
+        if (givesResults()) {
+            results_->addRow(*object);
+        }
     }
     if (tableRows_ != 0) {
         endGroups(0);
+        giveTotals(ResultRowKind::Total, groups_.tableTotals, totals_.front(), tableRows_, nullptr);
         lines_.finish(linesOf(groups_.tableTotals, totals_.front(), tableRows_, nullptr));
     }
     remarks_.setMissingLines(page_.lineCount());
@@ -104,8 +108,13 @@ void GroupedTable::beginGroups(std::size_t first, const UDataObject &object)
         line.before = level.before;
         if (level.heading.needsRows()) {
             group.heading = lines_.addOpen(line);
+            group.headingResult = givesResults() ? results_->addOpen() : 0;
         } else {
-            lines_.add(line, textOf(level.heading, totals_[i + 1], 0, &group.firstRow));
+            const QString text = textOf(level.heading, totals_[i + 1], 0, &group.firstRow);
+            lines_.add(line, text);
+            if (givesResults()) {
+                results_->addText(ResultText::GroupHeading, text);
+            }
         }
         isBound = true;
         afterHeading_ = true;
@@ -124,8 +133,13 @@ void GroupedTable::endGroups(std::size_t first)
         for (const QString &text : linesOf(level.totals, totals, group.rows, &group.firstRow)) {
             lines_.add(line, text);
         }
+        giveTotals(ResultRowKind::GroupFooter, level.totals, totals, group.rows, &group.firstRow);
         if (group.heading) {
-            lines_.setText(*group.heading, textOf(level.heading, totals, group.rows, &group.firstRow));
+            const QString text = textOf(level.heading, totals, group.rows, &group.firstRow);
+            lines_.setText(*group.heading, text);
+            if (givesResults()) {
+                results_->setText(group.headingResult, text);
+            }
         }
         addTo(totals_[i], totals);
         for (ColumnTotal &total : totals) {

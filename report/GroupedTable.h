@@ -3,6 +3,7 @@
 #include "ColumnTotal.h"
 #include "DataRemarks.h"
 #include "FieldFormatter.h"
+#include "GroupResults.h"
 #include "GroupedList.h"
 #include "KeptLines.h"
 #include "PageWriter.h"
@@ -37,6 +38,8 @@ public:
     GroupedTable(PageWriter &page, const FormatOptions &options, const UXmlReportTable &table, GroupedList &groups,
                  DataRemarks &remarks);
 
+    /// Has all that is written handed on as results as well. It must outlive the table.
+    void giveResults(GroupResults &results) { results_ = &results; }
     /// Writes all rows. Without any, nothing is written and the heading not placed.
     void write(const Rows &rows);
 
@@ -46,6 +49,7 @@ private:
     {
         UDataObject firstRow;
         std::optional<std::size_t> heading; ///< that has no text yet
+        std::size_t headingResult = 0;      ///< the same of the results
         quint64 rows = 0;
     };
     using Totals = std::vector<ColumnTotal>;
@@ -60,6 +64,10 @@ private:
     std::vector<QString> pageEnd();
     void clearPage();
     void addTo(Totals &totals, const Totals &other);
+    bool givesResults() const { return results_ != nullptr && results_->isWanted(); }
+    void giveTotals(ResultRowKind kind, const std::vector<TotalLine> &lines, const Totals &totals, quint64 rows,
+                    const UDataObject *object);
+    std::vector<ResultTotal> resultsOf(const TotalLine &line, const Totals &totals) const;
 
     QString textOf(const GroupText &text, const Totals &totals, quint64 rows, const UDataObject *object) const;
     QString totalText(const TotalCell &cell, const Totals &totals) const;
@@ -85,6 +93,7 @@ private:
     std::vector<TotalFormatter> texts_;                  ///< by the variables, for texts
     std::vector<TotalledCell> cells_;
     KeptLines lines_;
+    GroupResults *results_ = nullptr; ///< null where nobody wants them
 
     std::vector<OpenGroup> open_; ///< by the levels
     std::vector<Totals> totals_;  ///< of the table, and of the levels after it

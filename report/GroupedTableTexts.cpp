@@ -1,8 +1,11 @@
 #include "GroupedTable.h"
 
 #include "FieldMarker.h"
+#include "VariableType.h"
 
 #include <algorithm>
+#include <cmath>
+#include <limits>
 
 // The texts of headings and totals.
 
@@ -156,6 +159,54 @@ QString GroupedTable::lineOf(const TotalLine &line, const Totals &totals, const 
         text.replace(0, label.size(), label);
     }
     return text;
+}
+
+/// A line of totals as values, one for each column.
+std::vector<ResultTotal> GroupedTable::resultsOf(const TotalLine &line, const Totals &totals) const
+{
+    std::vector<ResultTotal> results;
+    TextBuffer unused; // there are no columns to fill
+    appendCells(unused, [&](std::size_t field, QStringView suffix) {
+        ResultTotal result;
+        if (const TotalCell *cell = cellOf(line, field)) {
+            TextBuffer text;
+            texts_[cell->variable].append(text, totals[cell->variable], cell->kind, suffix);
+            result.text = text.view().trimmed().toString();
+            const auto number = cells_[cell->variable].internal(totals[cell->variable], cell->kind);
+            const bool isWhole = fields_[field].Type == VARIABLE_INTEGER;
+            constexpr double mostWhole = std::numeric_limits<qint32>::max();
+            if (number && (!isWhole || (*number == std::floor(*number) && std::fabs(*number) <= mostWhole))) {
+                result.kind = isWhole ? ResultTotal::Kind::Whole : ResultTotal::Kind::Number;
+                result.number = *number;
+            }
+        }
+        results.push_back(std::move(result));
+    });
+    return results;
+}
+
+/// Hands lines of totals on. A label stands in the first column where that shows texts, else on a line of its own.
+void GroupedTable::giveTotals(ResultRowKind kind, const std::vector<TotalLine> &lines, const Totals &totals,
+                              quint64 rows, const UDataObject *object)
+{
+    if (!givesResults()) {
+        return;
+    }
+    const auto first = std::find_if(fieldFormatters_.begin(), fieldFormatters_.end(),
+                                    [](const FieldFormatter &field) { return field.marker() == FieldMarker::None; });
+    for (const TotalLine &line : lines) {
+        const QString label = textOf(line.label, totals, rows, object);
+        std::vector<ResultTotal> results = resultsOf(line, totals);
+        const bool hasRoom = first != fieldFormatters_.end() && first->showsText() && results.front().text.isEmpty();
+        if (hasRoom && !line.cells.empty()) {
+            results.front().text = label;
+        } else if (!label.isEmpty()) {
+            results_->addText(ResultText::GroupFooter, label);
+        }
+        if (!line.cells.empty()) {
+            results_->addTotals(kind, std::move(results));
+        }
+    }
 }
 
 } // namespace kareport

@@ -124,8 +124,31 @@ void ResultFeed::endRow(const UDataObject &object)
     }
     row_.object = &object;
     sink_->addRow(row_);
+    dropRow();
+}
+
+void ResultFeed::dropRow()
+{
     texts_.clear();
     ends_.clear();
+}
+
+void ResultFeed::addTotals(ResultRowKind kind, const std::vector<ResultTotal> &totals)
+{
+    std::vector<UDictEntry> entries;
+    entries.reserve(totals.size()); // the cells point into it
+    ResultRow row;
+    row.kind = kind;
+    for (const ResultTotal &total : totals) {
+        ResultCell &cell = row.cells.emplace_back();
+        cell.text = total.text;
+        if (total.kind == ResultTotal::Kind::Number) {
+            cell.value = &entries.emplace_back(0U, total.number);
+        } else if (total.kind == ResultTotal::Kind::Whole) {
+            cell.value = &entries.emplace_back(0U, static_cast<qint32>(total.number));
+        }
+    }
+    sink_->addRow(row);
 }
 
 void ResultFeed::endTable()

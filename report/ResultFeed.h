@@ -12,6 +12,20 @@ class UXmlReportTable;
 namespace kareport
 {
 
+/// A total as a sink of results gets it.
+struct ResultTotal
+{
+    enum class Kind
+    {
+        None,   ///< a text alone, such as a count
+        Number, ///< internal
+        Whole
+    };
+    Kind kind = Kind::None;
+    double number = 0;
+    QString text; ///< as the report shows it, without the blanks that fill the column
+};
+
 /// Hands the values of a table or a block to a sink of results while they are formatted.
 class ResultFeed
 {
@@ -31,6 +45,12 @@ public:
     /// Leaves the next column of a row without a value and without a text.
     void skip();
     void endRow(const UDataObject &object);
+    /// Forgets what was taken of a row.
+    void dropRow();
+    /// A line of text in a table.
+    void addText(ResultText kind, QStringView text) { sink_->addText(kind, text, 0); }
+    /// A row of totals. @param totals  one for each column without a marker
+    void addTotals(ResultRowKind kind, const std::vector<ResultTotal> &totals);
     void endTable();
 
 private:

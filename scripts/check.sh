@@ -45,7 +45,7 @@ while [ $# -gt 0 ]; do
 done
 [ ${#steps[@]} -gt 0 ] || steps=(tidy coverage fuzz)
 [ ${#folders[@]} -gt 0 ] ||
-    folders=(host templates groups page formats report print view ui geometry sources rows jobs apps tools bench examples fuzz tests)
+    folders=(host templates groups page formats report print view ui geometry sources rows exports jobs apps tools bench examples fuzz tests)
 
 # The files of a folder that clang-tidy reads. Test files are read in the files that include several of them, as most of the
 # time goes into reading headers. The example host is built by its own project: it is read with the options of a
