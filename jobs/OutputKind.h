@@ -43,8 +43,8 @@ struct Output
 {
     QString file; ///< "-" for standard output
     OutputKind kind = OutputKind::Text;
-    std::optional<qint64> mostBytes = std::nullopt;  ///< none when it may have any size
-    std::shared_ptr<const PdfDetails> pdf = nullptr; ///< what a PDF says of itself; null when it has its pages alone
+    std::optional<qint64> mostBytes = std::nullopt;   ///< none when it may have any size
+    std::shared_ptr<const PdfDetails> pdf = nullptr;  ///< what a PDF says of itself; null when it has its pages alone
     ResultOptions results = {};                       ///< of an output that is made of results
     std::optional<std::size_t> sideOf = std::nullopt; ///< the number of the output that it comes with
 

@@ -1822,6 +1822,21 @@
         <translation>die Datenbank wurde beim Lesen verändert, von einem Programm, das nicht SQLite verwendet</translation>
     </message>
     <message>
+        <location filename="../exports/XlsxBook.cpp"/>
+        <source>the workbook could not be put together: %1</source>
+        <translation>die Arbeitsmappe konnte nicht zusammengestellt werden: %1</translation>
+    </message>
+    <message>
+        <location filename="../exports/XlsxResult.cpp"/>
+        <source>%1 texts are longer than a cell of a workbook holds, and are cut</source>
+        <translation>%1 Texte sind länger als eine Zelle einer Arbeitsmappe fasst und wurden gekürzt</translation>
+    </message>
+    <message>
+        <location filename="../exports/XlsxResult.cpp"/>
+        <source>Lengths in %1, areas in %2, angles in %3</source>
+        <translation>Längen in %1, Flächen in %2, Winkel in %3</translation>
+    </message>
+    <message>
         <location filename="../jobs/ColumnChoices.cpp"/>
         <source>the name of a column, or its number from 1, was expected</source>
         <translation>der Name einer Spalte oder ihre Nummer ab 1 wurde erwartet</translation>
@@ -1840,6 +1855,21 @@
         <location filename="../jobs/ColumnNotes.cpp"/>
         <source>%1 more columns are not variables of the dictionary "%2"</source>
         <translation>%1 weitere Spalten sind keine Variablen des Wörterbuchs "%2"</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ConditionBinding.cpp"/>
+        <source>values of the variable "%1" are no numbers</source>
+        <translation>Werte der Variablen „%1“ sind keine Zahlen</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ConditionBinding.cpp"/>
+        <source>a tolerance from 0 on was expected</source>
+        <translation>eine Toleranz ab 0 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ConditionBinding.cpp"/>
+        <source>"%1" and "%2" cannot be compared: they have different units</source>
+        <translation>„%1“ und „%2“ können nicht verglichen werden: sie haben verschiedene Einheiten</translation>
     </message>
     <message>
         <location filename="../jobs/CsvData.cpp"/>
@@ -1895,6 +1925,51 @@
         <location filename="../jobs/DataKind.cpp"/>
         <source>Reading %1</source>
         <translation>%1 wird gelesen</translation>
+    </message>
+    <message>
+        <location filename="../jobs/FormulaBinding.cpp"/>
+        <source>the variable "%1" cannot take that: one of the same measure was expected, such as a length for lengths</source>
+        <translation>die Variable „%1“ kann das nicht aufnehmen: eine der gleichen Größenart wurde erwartet, etwa eine Länge für Längen</translation>
+    </message>
+    <message>
+        <location filename="../jobs/FormulaBinding.cpp"/>
+        <source>a variable cannot be computed of itself</source>
+        <translation>eine Variable kann nicht aus sich selbst berechnet werden</translation>
+    </message>
+    <message>
+        <location filename="../jobs/FormulaBinding.cpp"/>
+        <source>the variables do not go together: those of one measure were expected, such as lengths, or a product of two lengths or of a number</source>
+        <translation>die Variablen passen nicht zusammen: solche einer Größenart wurden erwartet, etwa Längen, oder ein Produkt zweier Längen oder mit einer Zahl</translation>
+    </message>
+    <message>
+        <location filename="../jobs/GroupBinding.cpp"/>
+        <source>groups by %1 need rows that are sorted by them first</source>
+        <translation>Gruppen nach %1 brauchen Zeilen, die zuerst danach sortiert sind</translation>
+    </message>
+    <message>
+        <location filename="../jobs/GroupBinding.cpp"/>
+        <source>the key "sort" was expected in the step</source>
+        <translation>der Schlüssel "sort" wurde im Schritt erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/GroupBinding.cpp"/>
+        <source>they are sorted by %1</source>
+        <translation>sie sind nach %1 sortiert</translation>
+    </message>
+    <message>
+        <location filename="../jobs/GroupBinding.cpp"/>
+        <source>values of the variable "%1" cannot be added up: a number, a length, an area or an angle was expected, or "count"</source>
+        <translation>Werte der Variablen „%1“ können nicht addiert werden: eine Zahl, eine Länge, eine Fläche oder ein Winkel wurde erwartet, oder "count"</translation>
+    </message>
+    <message>
+        <location filename="../jobs/GroupBinding.cpp"/>
+        <source>the table "%1" has no column "%2" for a total</source>
+        <translation>die Tabelle „%1“ hat keine Spalte „%2“ für eine Summe</translation>
+    </message>
+    <message>
+        <location filename="../jobs/GroupBinding.cpp"/>
+        <source>the column "%1" has a total already: another line was expected for a second one</source>
+        <translation>die Spalte „%1“ hat schon eine Summe: für eine zweite wurde eine weitere Zeile erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/JobData.cpp"/>
@@ -1963,6 +2038,11 @@
     </message>
     <message>
         <location filename="../jobs/JobOutputs.cpp"/>
+        <source>"%1" could not be written: %2</source>
+        <translation>„%1“ konnte nicht geschrieben werden: %2</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobOutputs.cpp"/>
         <source>the report could not be written to standard output: %1</source>
         <translation>der Bericht konnte nicht in die Standardausgabe geschrieben werden: %1</translation>
     </message>
@@ -1970,11 +2050,6 @@
         <location filename="../jobs/JobOutputs.cpp"/>
         <source>the report begins as rich text, but %1 (line %2, column %3)</source>
         <translation>der Bericht beginnt als Rich-Text, aber %1 (Zeile %2, Spalte %3)</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobOutputs.cpp"/>
-        <source>"%1" could not be written: %2</source>
-        <translation>„%1“ konnte nicht geschrieben werden: %2</translation>
     </message>
     <message>
         <location filename="../jobs/JobPdfReader.cpp"/>
@@ -2085,6 +2160,26 @@
         <location filename="../jobs/JobStepNotes.cpp"/>
         <source>%1 values of the field "%2" of the %3 "%4" are missing and show as blanks, the first one in row %5, line %6 of the report</source>
         <translation>%1 Werte des Felds "%2" (%3 "%4") fehlen und erscheinen als Leerzeichen, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 value of the variable "%2" is missing and in no total of the table "%3", in row %4</source>
+        <translation>%1 Wert der Variablen „%2“ fehlt und ist in keiner Summe der Tabelle „%3“, in Zeile %4</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values of the variable "%2" are missing and in no total of the table "%3", the first one in row %4</source>
+        <translation>%1 Werte der Variablen „%2“ fehlen und sind in keiner Summe der Tabelle „%3“, der erste in Zeile %4</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 value of the variable "%2" is infinite or not a number and in no total of the table "%3", in row %4</source>
+        <translation>%1 Wert der Variablen „%2“ ist unendlich oder keine Zahl und in keiner Summe der Tabelle „%3“, in Zeile %4</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values of the variable "%2" are infinite or not a number and in no total of the table "%3", the first one in row %4</source>
+        <translation>%1 Werte der Variablen „%2“ sind unendlich oder keine Zahl und in keiner Summe der Tabelle „%3“, der erste in Zeile %4</translation>
     </message>
     <message>
         <location filename="../jobs/JobStepNotes.cpp"/>
@@ -2267,6 +2362,41 @@
         <translation>ein Text, eine Zahl, true, false oder null wurde erwartet</translation>
     </message>
     <message>
+        <location filename="../jobs/ResultOptionsReader.cpp"/>
+        <source>a text that is not empty was expected</source>
+        <translation>erwartet wurde ein Text, der nicht leer ist</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ResultOptionsReader.cpp"/>
+        <source>the tag of a language such as de or pt-BR was expected</source>
+        <translation>erwartet wurde das Kürzel einer Sprache wie de oder pt-BR</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ResultOptionsReader.cpp"/>
+        <source>one ASCII character that is not a letter, a digit, a sign, a point, a quote, a blank or a line end was expected</source>
+        <translation>erwartet wurde ein ASCII-Zeichen, das kein Buchstabe, keine Ziffer, kein Vorzeichen, kein Punkt, kein Anführungszeichen, kein Leerzeichen und kein Zeilenende ist</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ResultOptionsReader.cpp"/>
+        <source>"table" or "block" was expected, not both</source>
+        <translation>erwartet wurde "table" oder "block", nicht beides</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ResultOptionsReader.cpp"/>
+        <source>the name of a file was expected</source>
+        <translation>erwartet wurde der Name einer Datei</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ResultOutputs.cpp"/>
+        <source>"%1" has the rows of a table or a block, and no such step of the job writes one</source>
+        <translation>"%1" hat die Zeilen einer Tabelle oder eines Blocks, und kein solcher Schritt des Auftrags schreibt welche</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ResultOutputs.cpp"/>
+        <source>"%1" has the rows of one step, and %2 steps may be meant: keys "table", "block" or "data" that leave one of them were expected</source>
+        <translation>"%1" hat die Zeilen eines Schritts, und %2 Schritte können gemeint sein: erwartet wurden Schlüssel "table", "block" oder "data", die einen davon übrig lassen</translation>
+    </message>
+    <message>
         <location filename="../jobs/SavedText.cpp"/>
         <source>a saved report was expected; this is a PDF</source>
         <translation>ein gespeicherter Bericht wurde erwartet; dies ist eine PDF-Datei</translation>
@@ -2277,6 +2407,41 @@
         <translation>eine Berichtsdatei wurde erwartet; dies ist kein UTF-8-Text</translation>
     </message>
     <message>
+        <location filename="../jobs/ShapeBinding.cpp"/>
+        <source>the template sorts the table "%1": "sort" is for tables that it does not sort</source>
+        <translation>die Vorlage sortiert die Tabelle „%1“: "sort" ist für Tabellen, die sie nicht sortiert</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ShapeBinding.cpp"/>
+        <source>rows are sorted before "%1" is computed: a variable of the data was expected</source>
+        <translation>Zeilen werden sortiert, bevor „%1“ berechnet wird: eine Variable der Daten wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ShapeBinding.cpp"/>
+        <source>"per": "group" goes with groups: the key "groups" was expected in the step</source>
+        <translation>"per": "group" gehört zu Gruppen: der Schlüssel "groups" wurde im Schritt erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ShapeBinding.cpp"/>
+        <source>another variable with numbers, lengths, areas or angles was expected</source>
+        <translation>eine andere Variable mit Zahlen, Längen, Flächen oder Winkeln wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ShapeBinding.cpp"/>
+        <source>a flag needs a text, or a mark: the variable "%1" is neither</source>
+        <translation>eine Markierung braucht einen Text oder ein Zeichen: die Variable „%1“ ist keines von beiden</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ShapeBinding.cpp"/>
+        <source>the key "text" with the text of the flag was expected</source>
+        <translation>der Schlüssel "text" mit dem Text der Markierung wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ShapeBinding.cpp"/>
+        <source>the variable "%1" has a mark and no text</source>
+        <translation>die Variable „%1“ hat ein Zeichen und keinen Text</translation>
+    </message>
+    <message>
         <location filename="../jobs/SqliteData.cpp"/>
         <source>there is no database "%1"</source>
         <translation>es gibt keine Datenbank „%1“</translation>
@@ -2285,6 +2450,46 @@
         <location filename="../jobs/SqliteData.cpp"/>
         <source>either "table" or "query" was expected</source>
         <translation>entweder "table" oder "query" wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TableShapeReader.cpp"/>
+        <source>the name of a variable was expected</source>
+        <translation>der Name einer Variablen wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TableShapeReader.cpp"/>
+        <source>one of %1 was expected, not two</source>
+        <translation>einer dieser Schlüssel wurde erwartet, nicht zwei: %1</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TableShapeReader.cpp"/>
+        <source>"beside" goes with above, below and outside alone</source>
+        <translation>"beside" gehört nur zu above, below und outside</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TableShapeReader.cpp"/>
+        <source>two variables were expected</source>
+        <translation>zwei Variablen wurden erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TableShapeReader.cpp"/>
+        <source>two variables or more were expected</source>
+        <translation>zwei oder mehr Variablen wurden erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TableShapeReader.cpp"/>
+        <source>the northing and easting, or the northing, easting and elevation, of two points were expected</source>
+        <translation>Hochwert und Rechtswert, oder Hochwert, Rechtswert und Höhe, zweier Punkte wurden erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TableShapeReader.cpp"/>
+        <source>the northing and easting of two points were expected</source>
+        <translation>Hochwert und Rechtswert zweier Punkte wurden erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TableShapeReader.cpp"/>
+        <source>"%1" goes with a heading: the key "heading" was expected</source>
+        <translation>"%1" gehört zu einer Überschrift: der Schlüssel "heading" wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/TemplateSource.cpp"/>
@@ -2330,6 +2535,16 @@
         <location filename="../jobs/ValuesData.cpp"/>
         <source>an object or a list of objects was expected</source>
         <translation>ein Objekt oder eine Liste von Objekten wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/VariableLookup.cpp"/>
+        <source>the dictionary "%1" has no variable "%2": %3</source>
+        <translation>das Wörterbuch „%1“ hat keine Variable „%2“: %3</translation>
+    </message>
+    <message>
+        <location filename="../jobs/VariableLookup.cpp"/>
+        <source>%1 was expected, as the variable "%2" has it</source>
+        <translation>%1 wurde erwartet, wie die Variable „%2“ es hat</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CheckCommand.cpp"/>
@@ -2403,6 +2618,46 @@
         <translation>Wert</translation>
     </message>
     <message>
+        <location filename="../apps/kareport/CommandLineErrors.cpp"/>
+        <source>%1 has no option "%2"</source>
+        <translation>%1 hat keine Option "%2"</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineErrors.cpp"/>
+        <source>"%1" was expected after "%2"</source>
+        <translation>"%1" wurde nach "%2" erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineErrors.cpp"/>
+        <source>%1: "%2" was not expected</source>
+        <translation>%1: "%2" wurde nicht erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineErrors.cpp"/>
+        <source>%1: %2 was expected</source>
+        <translation>%1: %2 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineErrors.cpp"/>
+        <source>%1 was given more than once</source>
+        <translation>%1 wurde mehr als einmal angegeben</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineErrors.cpp"/>
+        <source>%1 "%2": a whole number was expected</source>
+        <translation>%1 "%2": eine ganze Zahl wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineErrors.cpp"/>
+        <source>"%1" is not a command: %2</source>
+        <translation>"%1" ist kein Befehl: %2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineErrors.cpp"/>
+        <source>a command was expected: %1</source>
+        <translation>ein Befehl wurde erwartet: %1</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/CommandLineJob.cpp"/>
         <source>kareport: the report will have at least %1</source>
         <translation>kareport: der Bericht wird mindestens %1 haben</translation>
@@ -2444,11 +2699,6 @@
     </message>
     <message>
         <location filename="../apps/kareport/CommandSetup.cpp"/>
-        <source>--as: one of %1 was expected</source>
-        <translation>--as: einer dieser Werte wurde erwartet: %1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CommandSetup.cpp"/>
         <source>the ending of "%1" does not say the kind: --as with one of %2 was expected</source>
         <translation>die Endung von „%1“ nennt keine Art: --as mit einem dieser Werte wurde erwartet: %2</translation>
     </message>
@@ -2466,6 +2716,11 @@
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>--set "%1": a key of the page was expected, such as page.linesPerPage=60</source>
         <translation>--set "%1": ein Schlüssel der Seite wurde erwartet, etwa page.linesPerPage=60</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/ConvertCommand.cpp"/>
+        <source>"%1": a saved report has text alone, and no values that it could be made of: render its job instead</source>
+        <translation>"%1": ein gespeicherter Bericht hat nur Text und keine Werte, aus denen das gemacht werden könnte: stattdessen den Auftrag ausführen (render)</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
@@ -2488,6 +2743,81 @@
         <translation>--columns "%1": die Namen der Spalten in ihrer Reihenfolge oder VARIABLE=SPALTE für jede wurden erwartet</translation>
     </message>
     <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>standard output</source>
+        <translation>Standardausgabe</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>1 note</source>
+        <translation>1 Hinweis</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>%1 notes</source>
+        <translation>%1 Hinweise</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>kareport: the system has no more descriptors</source>
+        <translation>kareport: das System hat keine Deskriptoren mehr</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>there is not enough memory for this job</source>
+        <translation>für diesen Auftrag reicht der Speicher nicht</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>standard input can be read only once: a file was expected for each data set</source>
+        <translation>die Standardeingabe kann nur einmal gelesen werden: für jeden Datensatz wurde eine Datei erwartet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>kareport: %1: made in %2 s: %3</source>
+        <translation>kareport: %1: erstellt in %2 s: %3</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>kareport: %1: not all outputs were written</source>
+        <translation>kareport: %1: nicht alle Ausgaben wurden geschrieben</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>kareport: %1: failed; earlier outputs are unchanged</source>
+        <translation>kareport: %1: fehlgeschlagen; frühere Ausgaben sind unverändert</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>kareport: watching %1; press Ctrl+C to stop</source>
+        <translation>kareport: beobachtet werden %1; Strg+C beendet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/NewCommand.cpp"/>
+        <source>"%1" already exists; nothing was written</source>
+        <translation>"%1" gibt es schon; nichts wurde geschrieben</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/NewCommand.cpp"/>
+        <source>"%1" could not be created: %2</source>
+        <translation>"%1" konnte nicht angelegt werden: %2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/NewCommand.cpp"/>
+        <source>there is no folder "%1"; --parents creates it</source>
+        <translation>den Ordner "%1" gibt es nicht; --parents legt ihn an</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/NewCommand.cpp"/>
+        <source>Created %1 (template), %2 (data), %3 (job)</source>
+        <translation>Angelegt: %1 (Vorlage), %2 (Daten), %3 (Auftrag)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/NewCommand.cpp"/>
+        <source>Next: %1</source>
+        <translation>Als Nächstes: %1</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/NotesFile.cpp"/>
         <source>--notes "%1": the name of a file was expected</source>
         <translation>--notes "%1": der Name einer Datei wurde erwartet</translation>
@@ -2503,9 +2833,9 @@
         <translation>kareport: „%1“ konnte nicht geschrieben werden: %2</translation>
     </message>
     <message>
-        <location filename="../apps/kareport/RenderBatch.cpp"/>
-        <source>there is not enough memory for this job</source>
-        <translation>für diesen Auftrag reicht der Speicher nicht</translation>
+        <location filename="../apps/kareport/OutputFolders.cpp"/>
+        <source>the folder "%1" could not be created: %2</source>
+        <translation>der Ordner "%1" konnte nicht angelegt werden: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>
@@ -2608,6 +2938,11 @@
         <translation>„%1“ konnte nicht gestartet werden</translation>
     </message>
     <message>
+        <location filename="../apps/kareport/WatchCommand.cpp"/>
+        <source>standard input can be read only once: a job file was expected</source>
+        <translation>die Standardeingabe kann nur einmal gelesen werden: eine Auftragsdatei wurde erwartet</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>Open a job or a saved report, or drop it here.</source>
         <translation>Auftrag oder gespeicherten Bericht öffnen oder hierher ziehen.</translation>
@@ -2671,6 +3006,15 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
+        <source>"%1" was saved, but it differs from the report:
+
+%2</source>
+        <translation>„%1“ wurde gespeichert, weicht aber vom Bericht ab:
+
+%2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
         <source>"%1" was changed by another program, and it has unsaved changes here. Load it again and lose the changes made here?</source>
         <translation>„%1“ wurde von einem anderen Programm geändert, und hier gibt es Änderungen, die nicht gespeichert sind. Neu laden und die hier gemachten Änderungen verwerfen?</translation>
     </message>
@@ -2683,6 +3027,11 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>New from &amp;Template...	Ctrl+T</source>
         <translation>Neu aus &amp;Vorlage...	Ctrl+T</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>&amp;Export Values...	Ctrl+E</source>
+        <translation>Werte &amp;exportieren …	Ctrl+E</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
@@ -2844,6 +3193,31 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>It gets reports as plain text.</source>
         <translation>Es erhält Berichte als reinen Text.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobExport.cpp"/>
+        <source>Workbook</source>
+        <translation>Arbeitsmappe</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobExport.cpp"/>
+        <source>Web Page</source>
+        <translation>Webseite</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobExport.cpp"/>
+        <source>Rows as CSV</source>
+        <translation>Zeilen als CSV</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobExport.cpp"/>
+        <source>Rows as JSON Lines</source>
+        <translation>Zeilen als JSON Lines</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobExport.cpp"/>
+        <source>"%1": one of the endings .xlsx, .html, .csv and .jsonl was expected</source>
+        <translation>"%1": erwartet wurde eine der Endungen .xlsx, .html, .csv und .jsonl</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
@@ -3089,15 +3463,6 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
         <source>the report is empty, and a PDF has at least one page</source>
         <translation>der Bericht ist leer, und eine PDF-Datei hat mindestens eine Seite</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/SaveAs.cpp"/>
-        <source>"%1" was saved, but it differs from the report:
-
-%2</source>
-        <translation>„%1“ wurde gespeichert, weicht aber vom Bericht ab:
-
-%2</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>

@@ -1822,6 +1822,21 @@
         <translation>読み取り中に、SQLite を使わないプログラムによってデータベースが変更されました</translation>
     </message>
     <message>
+        <location filename="../exports/XlsxBook.cpp"/>
+        <source>the workbook could not be put together: %1</source>
+        <translation>ブックを組み立てられませんでした: %1</translation>
+    </message>
+    <message>
+        <location filename="../exports/XlsxResult.cpp"/>
+        <source>%1 texts are longer than a cell of a workbook holds, and are cut</source>
+        <translation>%1 個のテキストはブックのセルに収まらないため、切り詰められました</translation>
+    </message>
+    <message>
+        <location filename="../exports/XlsxResult.cpp"/>
+        <source>Lengths in %1, areas in %2, angles in %3</source>
+        <translation>長さ: %1、面積: %2、角度: %3</translation>
+    </message>
+    <message>
         <location filename="../jobs/ColumnChoices.cpp"/>
         <source>the name of a column, or its number from 1, was expected</source>
         <translation>列の名前、または 1 から始まる番号が必要です</translation>
@@ -1840,6 +1855,21 @@
         <location filename="../jobs/ColumnNotes.cpp"/>
         <source>%1 more columns are not variables of the dictionary "%2"</source>
         <translation>さらに %1 列が辞書 "%2" の変数ではありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ConditionBinding.cpp"/>
+        <source>values of the variable "%1" are no numbers</source>
+        <translation>変数「%1」の値は数値ではありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ConditionBinding.cpp"/>
+        <source>a tolerance from 0 on was expected</source>
+        <translation>0 以上の許容差が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ConditionBinding.cpp"/>
+        <source>"%1" and "%2" cannot be compared: they have different units</source>
+        <translation>「%1」と「%2」は比較できません: 単位が異なります</translation>
     </message>
     <message>
         <location filename="../jobs/CsvData.cpp"/>
@@ -1895,6 +1925,51 @@
         <location filename="../jobs/DataKind.cpp"/>
         <source>Reading %1</source>
         <translation>読み込み中: %1</translation>
+    </message>
+    <message>
+        <location filename="../jobs/FormulaBinding.cpp"/>
+        <source>the variable "%1" cannot take that: one of the same measure was expected, such as a length for lengths</source>
+        <translation>変数「%1」には入れられません: 同じ種類の量の変数が必要です (長さには長さなど)</translation>
+    </message>
+    <message>
+        <location filename="../jobs/FormulaBinding.cpp"/>
+        <source>a variable cannot be computed of itself</source>
+        <translation>変数をそれ自身から計算することはできません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/FormulaBinding.cpp"/>
+        <source>the variables do not go together: those of one measure were expected, such as lengths, or a product of two lengths or of a number</source>
+        <translation>変数の組み合わせが合いません: 同じ種類の量 (長さなど)、または二つの長さの積か数値との積が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/GroupBinding.cpp"/>
+        <source>groups by %1 need rows that are sorted by them first</source>
+        <translation>%1 によるグループには、まずその順に並んだ行が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/GroupBinding.cpp"/>
+        <source>the key "sort" was expected in the step</source>
+        <translation>ステップにキー "sort" が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/GroupBinding.cpp"/>
+        <source>they are sorted by %1</source>
+        <translation>行は %1 の順に並んでいます</translation>
+    </message>
+    <message>
+        <location filename="../jobs/GroupBinding.cpp"/>
+        <source>values of the variable "%1" cannot be added up: a number, a length, an area or an angle was expected, or "count"</source>
+        <translation>変数「%1」の値は合計できません: 数値、長さ、面積、角度、または "count" が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/GroupBinding.cpp"/>
+        <source>the table "%1" has no column "%2" for a total</source>
+        <translation>表「%1」には合計を置く列「%2」がありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/GroupBinding.cpp"/>
+        <source>the column "%1" has a total already: another line was expected for a second one</source>
+        <translation>列「%1」にはすでに合計があります: 二つ目には別の行が必要です</translation>
     </message>
     <message>
         <location filename="../jobs/JobData.cpp"/>
@@ -1963,6 +2038,11 @@
     </message>
     <message>
         <location filename="../jobs/JobOutputs.cpp"/>
+        <source>"%1" could not be written: %2</source>
+        <translation>「%1」に書き込めませんでした: %2</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobOutputs.cpp"/>
         <source>the report could not be written to standard output: %1</source>
         <translation>帳票を標準出力に書き込めませんでした: %1</translation>
     </message>
@@ -1970,11 +2050,6 @@
         <location filename="../jobs/JobOutputs.cpp"/>
         <source>the report begins as rich text, but %1 (line %2, column %3)</source>
         <translation>帳票はリッチテキストで始まっていますが、エラーがあります: %1 (%2 行 %3 桁)</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobOutputs.cpp"/>
-        <source>"%1" could not be written: %2</source>
-        <translation>「%1」に書き込めませんでした: %2</translation>
     </message>
     <message>
         <location filename="../jobs/JobPdfReader.cpp"/>
@@ -2085,6 +2160,26 @@
         <location filename="../jobs/JobStepNotes.cpp"/>
         <source>%1 values of the field "%2" of the %3 "%4" are missing and show as blanks, the first one in row %5, line %6 of the report</source>
         <translation>%3 "%4" のフィールド "%2" の値が %1 個なく、空白で表示されます。最初はデータの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 value of the variable "%2" is missing and in no total of the table "%3", in row %4</source>
+        <translation>変数「%2」の値が %1 個なく、表「%3」の合計に含まれていません (%4 行目)</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values of the variable "%2" are missing and in no total of the table "%3", the first one in row %4</source>
+        <translation>変数「%2」の値が %1 個なく、表「%3」の合計に含まれていません (最初は %4 行目)</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 value of the variable "%2" is infinite or not a number and in no total of the table "%3", in row %4</source>
+        <translation>変数「%2」の値が %1 個、無限大または数値でなく、表「%3」の合計に含まれていません (%4 行目)</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobStepNotes.cpp"/>
+        <source>%1 values of the variable "%2" are infinite or not a number and in no total of the table "%3", the first one in row %4</source>
+        <translation>変数「%2」の値が %1 個、無限大または数値でなく、表「%3」の合計に含まれていません (最初は %4 行目)</translation>
     </message>
     <message>
         <location filename="../jobs/JobStepNotes.cpp"/>
@@ -2267,6 +2362,41 @@
         <translation>文字列、数値、true、false、null のいずれかが必要です</translation>
     </message>
     <message>
+        <location filename="../jobs/ResultOptionsReader.cpp"/>
+        <source>a text that is not empty was expected</source>
+        <translation>空でないテキストが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ResultOptionsReader.cpp"/>
+        <source>the tag of a language such as de or pt-BR was expected</source>
+        <translation>de や pt-BR のような言語タグが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ResultOptionsReader.cpp"/>
+        <source>one ASCII character that is not a letter, a digit, a sign, a point, a quote, a blank or a line end was expected</source>
+        <translation>英字、数字、符号、ピリオド、引用符、空白、改行以外の ASCII 文字が 1 文字必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ResultOptionsReader.cpp"/>
+        <source>"table" or "block" was expected, not both</source>
+        <translation>"table" と "block" の両方ではなく、どちらか一方が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ResultOptionsReader.cpp"/>
+        <source>the name of a file was expected</source>
+        <translation>ファイル名が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ResultOutputs.cpp"/>
+        <source>"%1" has the rows of a table or a block, and no such step of the job writes one</source>
+        <translation>"%1" には表またはブロックの行が入りますが、それを書き込む手順がジョブにありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ResultOutputs.cpp"/>
+        <source>"%1" has the rows of one step, and %2 steps may be meant: keys "table", "block" or "data" that leave one of them were expected</source>
+        <translation>"%1" には 1 つの手順の行が入りますが、%2 個の手順が該当します: 1 つに絞るキー "table"、"block"、"data" が必要です</translation>
+    </message>
+    <message>
         <location filename="../jobs/SavedText.cpp"/>
         <source>a saved report was expected; this is a PDF</source>
         <translation>保存された帳票が必要です。これは PDF です</translation>
@@ -2277,6 +2407,41 @@
         <translation>帳票ファイルが必要です。これは UTF-8 ではありません</translation>
     </message>
     <message>
+        <location filename="../jobs/ShapeBinding.cpp"/>
+        <source>the template sorts the table "%1": "sort" is for tables that it does not sort</source>
+        <translation>表「%1」はテンプレートが並べ替えます: "sort" はテンプレートが並べ替えない表のためのものです</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ShapeBinding.cpp"/>
+        <source>rows are sorted before "%1" is computed: a variable of the data was expected</source>
+        <translation>行は「%1」が計算される前に並べ替えられます: データの変数が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ShapeBinding.cpp"/>
+        <source>"per": "group" goes with groups: the key "groups" was expected in the step</source>
+        <translation>"per": "group" はグループとともに使います: ステップにキー "groups" が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ShapeBinding.cpp"/>
+        <source>another variable with numbers, lengths, areas or angles was expected</source>
+        <translation>数値、長さ、面積、角度のいずれかをもつ別の変数が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ShapeBinding.cpp"/>
+        <source>a flag needs a text, or a mark: the variable "%1" is neither</source>
+        <translation>フラグにはテキストか印が必要です: 変数「%1」はどちらでもありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ShapeBinding.cpp"/>
+        <source>the key "text" with the text of the flag was expected</source>
+        <translation>フラグのテキストをもつキー "text" が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ShapeBinding.cpp"/>
+        <source>the variable "%1" has a mark and no text</source>
+        <translation>変数「%1」は印であり、テキストをもちません</translation>
+    </message>
+    <message>
         <location filename="../jobs/SqliteData.cpp"/>
         <source>there is no database "%1"</source>
         <translation>データベース「%1」はありません</translation>
@@ -2285,6 +2450,46 @@
         <location filename="../jobs/SqliteData.cpp"/>
         <source>either "table" or "query" was expected</source>
         <translation>"table" か "query" のどちらか一方が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TableShapeReader.cpp"/>
+        <source>the name of a variable was expected</source>
+        <translation>変数の名前が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TableShapeReader.cpp"/>
+        <source>one of %1 was expected, not two</source>
+        <translation>%1 のいずれか一つが必要です (二つは使えません)</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TableShapeReader.cpp"/>
+        <source>"beside" goes with above, below and outside alone</source>
+        <translation>"beside" は above、below、outside とだけ使えます</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TableShapeReader.cpp"/>
+        <source>two variables were expected</source>
+        <translation>変数が二つ必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TableShapeReader.cpp"/>
+        <source>two variables or more were expected</source>
+        <translation>変数が二つ以上必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TableShapeReader.cpp"/>
+        <source>the northing and easting, or the northing, easting and elevation, of two points were expected</source>
+        <translation>二点の北距と東距、または北距、東距、標高が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TableShapeReader.cpp"/>
+        <source>the northing and easting of two points were expected</source>
+        <translation>二点の北距と東距が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/TableShapeReader.cpp"/>
+        <source>"%1" goes with a heading: the key "heading" was expected</source>
+        <translation>"%1" は見出しとともに使います: キー "heading" が必要です</translation>
     </message>
     <message>
         <location filename="../jobs/TemplateSource.cpp"/>
@@ -2330,6 +2535,16 @@
         <location filename="../jobs/ValuesData.cpp"/>
         <source>an object or a list of objects was expected</source>
         <translation>オブジェクトまたはオブジェクトのリストが必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/VariableLookup.cpp"/>
+        <source>the dictionary "%1" has no variable "%2": %3</source>
+        <translation>辞書「%1」に変数「%2」がありません: %3</translation>
+    </message>
+    <message>
+        <location filename="../jobs/VariableLookup.cpp"/>
+        <source>%1 was expected, as the variable "%2" has it</source>
+        <translation>%1が必要です (変数「%2」の値として)</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CheckCommand.cpp"/>
@@ -2403,6 +2618,46 @@
         <translation>値</translation>
     </message>
     <message>
+        <location filename="../apps/kareport/CommandLineErrors.cpp"/>
+        <source>%1 has no option "%2"</source>
+        <translation>%1 に "%2" というオプションはありません</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineErrors.cpp"/>
+        <source>"%1" was expected after "%2"</source>
+        <translation>"%1" は "%2" の後に必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineErrors.cpp"/>
+        <source>%1: "%2" was not expected</source>
+        <translation>%1: "%2" は余分です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineErrors.cpp"/>
+        <source>%1: %2 was expected</source>
+        <translation>%1: %2 が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineErrors.cpp"/>
+        <source>%1 was given more than once</source>
+        <translation>%1 が 2 回以上指定されています</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineErrors.cpp"/>
+        <source>%1 "%2": a whole number was expected</source>
+        <translation>%1 "%2": 整数が必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineErrors.cpp"/>
+        <source>"%1" is not a command: %2</source>
+        <translation>"%1" はコマンドではありません: %2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineErrors.cpp"/>
+        <source>a command was expected: %1</source>
+        <translation>コマンドが必要です: %1</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/CommandLineJob.cpp"/>
         <source>kareport: the report will have at least %1</source>
         <translation>kareport: レポートは少なくとも %1 になります</translation>
@@ -2444,11 +2699,6 @@
     </message>
     <message>
         <location filename="../apps/kareport/CommandSetup.cpp"/>
-        <source>--as: one of %1 was expected</source>
-        <translation>--as: 次のいずれかが必要です: %1</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CommandSetup.cpp"/>
         <source>the ending of "%1" does not say the kind: --as with one of %2 was expected</source>
         <translation>「%1」の拡張子からは種類がわかりません: --as に次のいずれかを指定する必要があります: %2</translation>
     </message>
@@ -2466,6 +2716,11 @@
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
         <source>--set "%1": a key of the page was expected, such as page.linesPerPage=60</source>
         <translation>--set "%1": page.linesPerPage=60 のようなページのキーが必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/ConvertCommand.cpp"/>
+        <source>"%1": a saved report has text alone, and no values that it could be made of: render its job instead</source>
+        <translation>"%1": 保存された報告書にはテキストだけで値がないため作れません: 代わりにジョブを実行してください (render)</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
@@ -2488,6 +2743,81 @@
         <translation>--columns "%1": 列の名前を順に並べたもの、または各列の 変数=列 が必要です</translation>
     </message>
     <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>standard output</source>
+        <translation>標準出力</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>1 note</source>
+        <translation>注意 1 件</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>%1 notes</source>
+        <translation>注意 %1 件</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>kareport: the system has no more descriptors</source>
+        <translation>kareport: システムの記述子が足りません</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>there is not enough memory for this job</source>
+        <translation>このジョブにはメモリが足りません</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>standard input can be read only once: a file was expected for each data set</source>
+        <translation>標準入力は一度しか読めません: データごとにファイルが必要です</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>kareport: %1: made in %2 s: %3</source>
+        <translation>kareport: %1: %2 秒で作成: %3</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>kareport: %1: not all outputs were written</source>
+        <translation>kareport: %1: 一部の出力を書き込めませんでした</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>kareport: %1: failed; earlier outputs are unchanged</source>
+        <translation>kareport: %1: 失敗しました。以前の出力は変わりません</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/JobWatch.cpp"/>
+        <source>kareport: watching %1; press Ctrl+C to stop</source>
+        <translation>kareport: %1 を監視しています。Ctrl+C で終了します</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/NewCommand.cpp"/>
+        <source>"%1" already exists; nothing was written</source>
+        <translation>"%1" は既にあります。何も書き込んでいません</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/NewCommand.cpp"/>
+        <source>"%1" could not be created: %2</source>
+        <translation>"%1" を作成できませんでした: %2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/NewCommand.cpp"/>
+        <source>there is no folder "%1"; --parents creates it</source>
+        <translation>フォルダー "%1" がありません。--parents で作成します</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/NewCommand.cpp"/>
+        <source>Created %1 (template), %2 (data), %3 (job)</source>
+        <translation>作成しました: %1 (テンプレート)、%2 (データ)、%3 (ジョブ)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/NewCommand.cpp"/>
+        <source>Next: %1</source>
+        <translation>次: %1</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/NotesFile.cpp"/>
         <source>--notes "%1": the name of a file was expected</source>
         <translation>--notes "%1": ファイル名が必要です</translation>
@@ -2503,9 +2833,9 @@
         <translation>kareport: 「%1」を書き込めませんでした: %2</translation>
     </message>
     <message>
-        <location filename="../apps/kareport/RenderBatch.cpp"/>
-        <source>there is not enough memory for this job</source>
-        <translation>このジョブにはメモリが足りません</translation>
+        <location filename="../apps/kareport/OutputFolders.cpp"/>
+        <source>the folder "%1" could not be created: %2</source>
+        <translation>フォルダー "%1" を作成できませんでした: %2</translation>
     </message>
     <message>
         <location filename="../apps/kareport/RenderBatch.cpp"/>
@@ -2608,6 +2938,11 @@
         <translation>「%1」を起動できませんでした</translation>
     </message>
     <message>
+        <location filename="../apps/kareport/WatchCommand.cpp"/>
+        <source>standard input can be read only once: a job file was expected</source>
+        <translation>標準入力は一度しか読めません: ジョブファイルが必要です</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>Open a job or a saved report, or drop it here.</source>
         <translation>ジョブまたは保存した帳票を開くか、ここにドロップしてください。</translation>
@@ -2671,6 +3006,15 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
+        <source>"%1" was saved, but it differs from the report:
+
+%2</source>
+        <translation>「%1」を保存しましたが、レポートと異なる点があります:
+
+%2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
         <source>"%1" was changed by another program, and it has unsaved changes here. Load it again and lose the changes made here?</source>
         <translation>「%1」は別のプログラムで変更されましたが、ここにも未保存の変更があります。再読み込みして、ここでの変更を破棄しますか?</translation>
     </message>
@@ -2683,6 +3027,11 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>New from &amp;Template...	Ctrl+T</source>
         <translation>テンプレートから新規作成(&amp;T)...	Ctrl+T</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>&amp;Export Values...	Ctrl+E</source>
+        <translation>値のエクスポート(&amp;E)...	Ctrl+E</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
@@ -2844,6 +3193,31 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>It gets reports as plain text.</source>
         <translation>帳票はプレーンテキストで渡されます。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobExport.cpp"/>
+        <source>Workbook</source>
+        <translation>ブック</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobExport.cpp"/>
+        <source>Web Page</source>
+        <translation>Web ページ</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobExport.cpp"/>
+        <source>Rows as CSV</source>
+        <translation>行 (CSV)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobExport.cpp"/>
+        <source>Rows as JSON Lines</source>
+        <translation>行 (JSON Lines)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobExport.cpp"/>
+        <source>"%1": one of the endings .xlsx, .html, .csv and .jsonl was expected</source>
+        <translation>"%1": 拡張子 .xlsx、.html、.csv、.jsonl のいずれかが必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
@@ -3089,15 +3463,6 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
         <source>the report is empty, and a PDF has at least one page</source>
         <translation>レポートが空です。PDFには少なくとも1ページ必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/SaveAs.cpp"/>
-        <source>"%1" was saved, but it differs from the report:
-
-%2</source>
-        <translation>「%1」を保存しましたが、レポートと異なる点があります:
-
-%2</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
