@@ -37,7 +37,10 @@ DeskFrame::DeskFrame() : files_([this](const QString &path) { fileChanged(path);
                                              QStringLiteral(";;") + Xlate("All files (*)"));
         return path.isEmpty() ? std::nullopt : std::optional(path);
     };
-    askExport = [this](const kareport::SaveRequest &request) { return kareport::askSavePath(this, request); };
+    askExport = [this](const kareport::SaveRequest &request) -> std::optional<QString> {
+        const std::optional<kareport::SaveChoice> choice = kareport::askSavePath(this, request);
+        return choice ? std::optional(choice->path) : std::nullopt;
+    };
     askTemplate = [this](const QString &templateFile) -> std::optional<kareport::TemplateJob> {
         kareport::TemplateDialog dialog(this);
         if (!templateFile.isEmpty()) {

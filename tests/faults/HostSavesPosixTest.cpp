@@ -5,6 +5,7 @@
 #include "FrameFixture.h"
 #include "JobRunnerFixture.h"
 #include "NotesFile.h"
+#include "OutputFolders.h"
 
 #include <QTemporaryDir>
 
@@ -74,7 +75,7 @@ TEST(HostSaves, NotesAreWholeOrItIsSaid)
     failEachCall(
         path, [] { testing::internal::CaptureStderr(); },
         [&] {
-            const bool isWritten = kareport::writeNotesFile(notes, path);
+            const bool isWritten = kareport::writeNotesFile(notes, path, kareport::OutputFolders(false));
             const std::string said = testing::internal::GetCapturedStderr();
             EXPECT_EQ(said.empty(), isWritten);
             EXPECT_TRUE(isWritten || said.find(path.toStdString() + "\" could not be written: ") != std::string::npos)

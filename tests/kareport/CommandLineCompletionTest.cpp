@@ -90,7 +90,7 @@ TEST(CommandLineCompletion, BashCompletes)
         {"kareport render --pr", "--progress", "an option"},
         {"kareport check --js", "--json", "of its command"},
         {"kareport view --js", "", "not of another"},
-        {"kareport render --as ", "pdf|rep|rtf|rtf-image|text", "kinds"},
+        {"kareport render --as ", "csv|html|jsonl|pdf|rep|rtf|rtf-image|text|xlsx", "kinds"},
         {"kareport render job.json --as rt", "rtf|rtf-image", "after other words"},
         {"kareport render --as = rt", "rtf|rtf-image", "after an equals sign"},
         {"kareport render j", "job.json", "jobs"},
