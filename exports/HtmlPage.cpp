@@ -29,10 +29,10 @@ thead th{background:var(--band);border-bottom:2px solid var(--line);position:sti
 td.n{font-family:ui-monospace,"DejaVu Sans Mono","Liberation Mono",Consolas,monospace;font-size:.93em;white-space:pre}
 tbody.g th{background:var(--band);padding-top:.6rem}
 tbody.t td{border-top:1px solid currentColor;font-weight:bold}
-thead button{all:unset;cursor:pointer}
-thead button:focus-visible{outline:2px solid currentColor;outline-offset:2px}
-th[aria-sort=ascending] button::after{content:" \25B2"}
-th[aria-sort=descending] button::after{content:" \25BC"}
+thead [role=button]{cursor:pointer}
+thead [role=button]:focus-visible{outline:2px solid currentColor;outline-offset:2px}
+th[aria-sort=ascending] span::after{content:" \25B2"}
+th[aria-sort=descending] span::after{content:" \25BC"}
 @media print{
 :root{color-scheme:light;--line:#999;--band:#fff;--quiet:#444}
 body{font-size:9pt;margin:0;max-width:none;padding:0}
@@ -42,33 +42,44 @@ thead th{position:static}
 tr{break-inside:avoid}
 h2,tbody.g{break-after:avoid}
 tbody.t{break-before:avoid}
-th[aria-sort] button::after{content:""}
+th[aria-sort] span::after{content:""}
 }
 )";
 
-// Rows are sorted in each group by themselves. A number is that of the cell, or of its text.
+// Rows are sorted in each group by themselves. A number is that of the cell, or of its text. The labels are no button
+// elements: Chromium does not repeat a heading that has one on each sheet of paper.
 constexpr std::string_view script = R"(
 for (const table of document.querySelectorAll('table.data')) {
   const heads = [...table.tHead.rows[0].cells];
-  heads.forEach((head, column) => head.firstElementChild.addEventListener('click', () => {
-    const falls = head.getAttribute('aria-sort') === 'ascending';
-    for (const other of heads) other.removeAttribute('aria-sort');
-    head.setAttribute('aria-sort', falls ? 'descending' : 'ascending');
-    const isNumber = head.classList.contains('n') || head.dataset.v !== undefined;
-    const keyOf = row => {
-      const cell = row.cells[column];
-      if (!isNumber) return cell.textContent;
-      const number = parseFloat(cell.dataset.v ?? cell.textContent);
-      return isNaN(number) ? -Infinity : number;
-    };
-    const text = new Intl.Collator(undefined, {numeric: true});
-    const compare = isNumber ? (a, b) => a < b ? -1 : a > b ? 1 : 0 : text.compare;
-    for (const body of table.querySelectorAll('tbody.d')) {
-      const rows = [...body.rows].map(row => [keyOf(row), row]);
-      rows.sort((a, b) => falls ? compare(b[0], a[0]) : compare(a[0], b[0]));
-      body.append(...rows.map(row => row[1]));
-    }
-  }));
+  heads.forEach((head, column) => {
+    const label = head.firstElementChild;
+    label.setAttribute('role', 'button');
+    label.tabIndex = 0;
+    label.addEventListener('keydown', event => {
+      if (event.key !== 'Enter' && event.key !== ' ') return;
+      event.preventDefault();
+      label.click();
+    });
+    label.addEventListener('click', () => {
+      const falls = head.getAttribute('aria-sort') === 'ascending';
+      for (const other of heads) other.removeAttribute('aria-sort');
+      head.setAttribute('aria-sort', falls ? 'descending' : 'ascending');
+      const isNumber = head.classList.contains('n') || head.dataset.v !== undefined;
+      const keyOf = row => {
+        const cell = row.cells[column];
+        if (!isNumber) return cell.textContent;
+        const number = parseFloat(cell.dataset.v ?? cell.textContent);
+        return isNaN(number) ? -Infinity : number;
+      };
+      const text = new Intl.Collator(undefined, {numeric: true});
+      const compare = isNumber ? (a, b) => a < b ? -1 : a > b ? 1 : 0 : text.compare;
+      for (const body of table.querySelectorAll('tbody.d')) {
+        const rows = [...body.rows].map(row => [keyOf(row), row]);
+        rows.sort((a, b) => falls ? compare(b[0], a[0]) : compare(a[0], b[0]));
+        body.append(...rows.map(row => row[1]));
+      }
+    });
+  });
 }
 )";
 

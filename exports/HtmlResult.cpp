@@ -139,9 +139,9 @@ void HtmlResult::writeTableHead()
     out() += "<table class=\"data\" aria-label=\"" + label_ + "\">\n<thead>\n<tr>";
     for (const Column &column : columns_) {
         out() += "<th scope=\"col\"" + column.opening;
-        out() += column.hasSortValue && !column.isNumber ? " data-v><button>" : "><button>";
+        out() += column.hasSortValue && !column.isNumber ? " data-v><span>" : "><span>";
         appendHtmlText(out(), column.column.field.Label.trimmed());
-        out() += "</button></th>";
+        out() += "</span></th>";
     }
     out() += "</tr>\n</thead>\n";
 }
