@@ -106,6 +106,7 @@ void GroupedTable::beginGroups(std::size_t first, const UDataObject &object)
         line.isBound = isBound;
         line.beginsPage = level.newPage;
         line.before = level.before;
+        line.group = static_cast<int>(i);
         if (level.heading.needsRows()) {
             group.heading = lines_.addOpen(line);
             group.headingResult = givesResults() ? results_->addOpen() : 0;

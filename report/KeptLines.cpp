@@ -1,5 +1,7 @@
 #include "KeptLines.h"
 
+#include "ReportOutline.h"
+
 namespace kareport
 {
 
@@ -63,6 +65,9 @@ void KeptLines::writeTogether(std::size_t begin, std::size_t end, const std::vec
         const Held &held = lines_[i];
         if (i > begin && reserved_ >= page_.linesLeft() && !isAtTop()) {
             endPage(); // a page is too small for all of it
+        }
+        if (held.line.group >= 0) {
+            page_.announceEntry(ReportOutline::firstGroupLevel + held.line.group, textOf(held).toString().simplified());
         }
         writeLine(textOf(held), held.line.before, isLast && i + 1 == end);
         if (held.line.row != 0) {

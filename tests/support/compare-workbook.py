@@ -1,4 +1,4 @@
-#!/usr/bin/env python3
+#!/usr/bin/python3
 """Compares the first sheet of a workbook with the same table as a report prints it.
 
     compare-workbook.py BOOK.xlsx PRINTED.csv OFFICE.csv
