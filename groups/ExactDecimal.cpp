@@ -25,7 +25,7 @@ std::string withPoint(std::string digits, int decimals)
     if (digits.size() <= behind) {
         digits.insert(0, behind + 1 - digits.size(), '0');
     }
-    return digits.insert(digits.size() - behind, ".");
+    return digits.insert(digits.size() - behind, 1, '.');
 }
 
 } // namespace
