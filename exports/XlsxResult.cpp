@@ -213,7 +213,8 @@ void XlsxResult::writeCell(const Column &column, lxw_col_t at, const ResultCell 
             const qlonglong count = cell.text.toLongLong(&isCount);
             if (isTotal && isCount) {
                 CellLook look = column.look;
-                look.numberFormat.assign(1, '0'); // GCC 12 takes the assignment of a literal here for an overlapping copy
+                look.numberFormat.assign(1,
+                                         '0'); // GCC 12 takes the assignment of a literal here for an overlapping copy
                 look.isBold = true;
                 look.hasRule = true;
                 XlsxBook::writeNumber(table_.sheet, table_.nextRow, at, static_cast<double>(count),
