@@ -39,7 +39,7 @@ QString quoted(QString text)
     return u'\'' + text.replace(u'\'', QStringLiteral("'\\''")) + u'\'';
 }
 
-/// A text in a specification of _arguments or _describe, where some characters separate its parts.
+/// A text in an entry of _arguments or _describe, where some characters separate its parts.
 QString escaped(const QString &text)
 {
     QString safe;
@@ -78,7 +78,7 @@ QString completing(ValueKind kind, const QStringList &commands)
 }
 
 /// An option for _arguments, with its value after it or after a "=".
-QString optionSpecification(const OptionWords &option, const QStringList &commands)
+QString optionEntry(const OptionWords &option, const QStringList &commands)
 {
     const bool takesValue = option.kind != ValueKind::Flag;
     QString text = u'[' + escaped(option.description) + u']';
@@ -95,7 +95,7 @@ QString optionSpecification(const OptionWords &option, const QStringList &comman
     return quoted(before) + u'{' + shortName + u',' + longName + u'}' + quoted(text);
 }
 
-QString argumentSpecification(const OptionWords &argument, std::size_t number, const QStringList &commands)
+QString argumentEntry(const OptionWords &argument, std::size_t number, const QStringList &commands)
 {
     const QString place = argument.isRepeated ? QStringLiteral("*") : QString::number(number + 1);
     return quoted(place + u':' + escaped(argument.valueName) + u':' + completing(argument.kind, commands));
@@ -106,10 +106,10 @@ QString caseOf(const CommandWords &command, const QStringList &commands)
     QString text = QStringLiteral("    %1)\n        _arguments -s -S").arg(command.name);
     const QString nextLine = QStringLiteral(" \\\n            ");
     for (const OptionWords &option : command.options) {
-        text += nextLine + optionSpecification(option, commands);
+        text += nextLine + optionEntry(option, commands);
     }
     for (std::size_t i = 0; i < command.arguments.size(); ++i) {
-        text += nextLine + argumentSpecification(command.arguments[i], i, commands);
+        text += nextLine + argumentEntry(command.arguments[i], i, commands);
     }
     return text + QStringLiteral("\n        ;;\n");
 }
