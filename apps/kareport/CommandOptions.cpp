@@ -8,15 +8,6 @@ namespace kareport
 namespace
 {
 
-QStringList textsOf(const std::vector<std::string> &words)
-{
-    QStringList list;
-    for (const std::string &word : words) {
-        list.append(textOf(word));
-    }
-    return list;
-}
-
 CLI::App *addConvert(CLI::App &program, ConvertWords &words, ValueKinds &kinds)
 {
     CLI::App *convert =
@@ -129,6 +120,15 @@ CommandWords wordsOf(const CLI::App &command, const ValueKinds &kinds)
 QString textOf(const std::string &word)
 {
     return QString::fromLocal8Bit(word.data(), static_cast<qsizetype>(word.size()));
+}
+
+QStringList textsOf(const std::vector<std::string> &words)
+{
+    QStringList list;
+    for (const std::string &word : words) {
+        list.append(textOf(word));
+    }
+    return list;
 }
 
 CLI::Option *ValueKinds::note(ValueKind kind, CLI::Option *option)

@@ -13,8 +13,9 @@
 namespace kareport
 {
 
-/// A word of the command line.
+/// A word of the command line, and several.
 QString textOf(const std::string &word);
+QStringList textsOf(const std::vector<std::string> &words);
 
 /// What the options take that were added to a command line, beside what its parser knows of them.
 class ValueKinds

@@ -6,15 +6,6 @@ namespace kareport
 namespace
 {
 
-QStringList textsOf(const std::vector<std::string> &words)
-{
-    QStringList list;
-    for (const std::string &word : words) {
-        list.append(textOf(word));
-    }
-    return list;
-}
-
 std::optional<QString> textIfAny(const std::optional<std::string> &word)
 {
     return word ? std::optional(textOf(*word)) : std::nullopt;
