@@ -183,9 +183,6 @@ void HtmlResult::addRow(const ResultRow &row)
         writeBlock(row);
         return;
     }
-    if (row.kind == ResultRowKind::PageTotal) {
-        return; // there are no pages of lines here
-    }
     const bool isData = row.kind == ResultRowKind::Row;
     if (isData) {
         turnFullPage();

@@ -49,7 +49,6 @@ private:
     void endBody();
     void writeBlock(const ResultRow &row);
     void writeCells(const ResultRow &row);
-    void writeNumber(const Column &column, const ResultCell &cell);
 
     ResultOptions options_;
     QString fileName_;

@@ -176,9 +176,6 @@ void XlsxResult::addRow(const ResultRow &row)
         writeBlock(row);
         return;
     }
-    if (row.kind == ResultRowKind::PageTotal) {
-        return; // there are no pages here
-    }
     makeRoom();
     for (std::size_t i = 0; i < columns_.size(); ++i) {
         writeCell(columns_[i], static_cast<lxw_col_t>(i), row.cells[columns_[i].place], row.kind != ResultRowKind::Row);

@@ -64,7 +64,7 @@ private:
     ResultOptions options_;
     std::unique_ptr<XlsxBook> book_;
     QString title_;
-    QByteArray properties_[4]; ///< title, author, comments, keywords: kept while the library has them
+    QByteArray properties_[3]; ///< title, author, comments: kept while the library has them
     std::int64_t created_ = 0;
     UJobSettings settings_;
     bool isSettingsKnown_ = false;

@@ -48,11 +48,9 @@ struct ResultCell
 /// What a row is.
 enum class ResultRowKind
 {
-    Row,          ///< an object of the data
-    GroupHeading, ///< values that a group begins with
-    GroupFooter,  ///< values that a group ends with
-    PageTotal,    ///< totals of a page
-    Total         ///< totals of the table
+    Row,         ///< an object of the data
+    GroupFooter, ///< values that a group ends with
+    Total        ///< totals of the table; those of pages are no results, which have no pages
 };
 
 struct ResultRow
