@@ -1,6 +1,7 @@
 #include "CompressedFaces.h"
 #include "PdfExport.h"
 #include "ProcessorTime.h"
+#include "Profile.h"
 #include "UReportDoc.h"
 
 #include <QBuffer>
