@@ -107,9 +107,13 @@ void MappedFile::release(std::size_t end) const
 
 void MappedFile::release(std::size_t begin, std::size_t end) const
 {
+    // Before the first mapping of the process the size of a page is not known.
+    if (begin_ == nullptr) {
+        return;
+    }
     const std::size_t first = begin / pageSize * pageSize;
     const std::size_t last = std::min(end, size_) / pageSize * pageSize;
-    if (begin_ != nullptr && first < last) {
+    if (first < last) {
         madvise(begin_ + first, last - first, MADV_DONTNEED);
     }
 }

@@ -263,4 +263,18 @@ TEST(JsonFileList, KeysWithoutEndTakeNoMemoryWithoutEnd)
     EXPECT_LE(list.reader().columns().size(), 10000U);
 }
 
+// A suite of its own, and so a process of its own: it must not map a file before, as a program does not whose data come
+// through a pipe.
+TEST(JsonInMemory, IsReadToItsEnd)
+{
+    const QByteArray rest = ",\"Description\":\"" + QByteArray(1000, 'x') + "\"}\n";
+    QByteArray text;
+    for (int i = 0; text.size() < (12 << 20); ++i) { // several of the pieces that a file's memory is given back in
+        text += "{\"Number\":" + QByteArray::number(i) + rest;
+    }
+    const auto rows = text.count('\n');
+    JsonFileList list(kareport::FileBytes::holding(QStringLiteral("-"), text), {}, survey::variables(), {});
+    EXPECT_EQ(survey::rowsOf(list).size(), rows);
+}
+
 } // namespace
