@@ -127,6 +127,17 @@ bool isPlainText(std::string_view text)
 
 bool toPlainNumbers(std::string_view text, const NumberStyle &style, std::string &result)
 {
+    if (style.thousands.empty()) { // most files: one sign for another
+        result = text;
+        for (char &character : result) {
+            if (character == style.decimal) {
+                character = '.';
+            } else if (character == '.') {
+                return false;
+            }
+        }
+        return true;
+    }
     result.clear();
     bool isFraction = false;
     for (std::size_t at = 0; at < text.size();) {
