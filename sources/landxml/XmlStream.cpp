@@ -15,6 +15,17 @@ namespace
 
 constexpr std::size_t blockSize = std::size_t(1) << 16;
 
+/// Whether names of a few letters are the same, faster than by their lengths.
+bool isSame(const std::string &known, const char *name)
+{
+    const char *character = known.c_str();
+    while (*character != '\0' && *character == *name) {
+        ++character;
+        ++name;
+    }
+    return *character == *name;
+}
+
 } // namespace
 
 std::optional<std::string_view> XmlAttributes::find(std::string_view name) const
@@ -148,9 +159,13 @@ void XmlStream::leaveOut(bool isTold, bool isForeign)
 
 void XmlStream::ended()
 {
+    if (leftOutFrom_ != 0 && depth_ > leftOutFrom_) {
+        --depth_; // nothing was begun with it
+        return;
+    }
     if (leftOutFrom_ == 0) {
         handler_.endElement();
-    } else if (leftOutFrom_ == depth_) {
+    } else {
         leftOutFrom_ = 0;
         tellLeftOut();
     }
@@ -163,7 +178,7 @@ void XmlStream::ended()
 /// Counts an element in one that is left out. Millions of one name follow each other in a large file.
 void XmlStream::countLeftOut(const char *name)
 {
-    if (leftOutName_ != name) {
+    if (!isSame(leftOutName_, name)) {
         tellLeftOut();
         leftOutName_ = name;
     }
