@@ -10,7 +10,8 @@ usage: scripts/check.sh [tidy | coverage | fuzz]... [--folder FOLDER]... [--seco
 
 Runs what is named, or all three, and installs what they need. Exit status 1 when one of them has found something.
 
-  tidy       clang-tidy over every source, tests included, folder by folder (build/tidy). Nothing is built: an hour or two.
+  tidy       clang-tidy over every source, tests included, folder by folder (build/tidy). Nothing is built: an hour or two the
+             first time; what was clean and has not changed since is not read again
   coverage   the tests, instrumented (build/coverage): the lines reached in each folder, and a page for each file in
              out/coverage
   fuzz       a minute of each fuzz target under the sanitizers (build/fuzz). New inputs stay in build/fuzz/corpus; one that
@@ -47,49 +48,15 @@ done
 [ ${#folders[@]} -gt 0 ] ||
     folders=(host templates groups page formats report print view ui geometry sources rows exports jobs apps tools bench examples fuzz tests)
 
-# The files of a folder that clang-tidy reads. Test files are read in the files that include several of them, as most of the
-# time goes into reading headers. The example host is built by its own project: it is read with the options of a
-# program that sees the same headers.
-tidied() { # folder
-    python3 - "$1" << 'PYTHON'
-import json, pathlib, sys
-root = pathlib.Path.cwd()
-build = root / "build/tidy"
-database = build / "compile_commands.json"
-entries = json.loads(database.read_text())
-example = str(root / "examples/host/main.cpp")
-if all(entry["file"] != example for entry in entries):
-    like = next(entry for entry in entries if entry["file"] == str(root / "tools/pictures/main.cpp"))
-    command = like["command"].replace(like["file"], example).replace(" -c ", r' -DHOST_TEMPLATES=\"\" -c ')
-    entries.append({**like, "file": example, "command": command})
-    database.write_text(json.dumps(entries, indent=0))
-for entry in entries:
-    path = pathlib.Path(entry["file"])
-    name = path.relative_to(build if path.is_relative_to(build) else root).as_posix()
-    generated = "cmake_pch" in name or "qrc_" in name or "verify_interface" in name
-    if not generated and (name + "/").startswith(sys.argv[1] + "/"):
-        print(path)
-PYTHON
-}
-
 run_tidy() {
     scripts/packages.sh build test bench tidy || return 1
     cmake --preset tidy > build/tidy.log 2>&1 || { cat build/tidy.log >&2; return 1; }
-    local batch folder files found=0
+    local batch
     # Only the files that include the tests are made: asked for them, ninja would build the libraries first.
     for batch in $(ninja -C build/tidy -t targets all | sed -nE 's/^(tests\/.*batch[0-9]+\.cpp): CUSTOM_COMMAND$/\1/p'); do
         sh -c "$(ninja -C build/tidy -t commands -s "$batch")" || return 1
     done
-    for folder in "${folders[@]}"; do
-        files=$(tidied "$folder" | sort -u)
-        [ -n "$files" ] || { echo "clang-tidy: $folder: nothing of it is built"; continue; }
-        echo "clang-tidy: $folder ($(wc -l <<< "$files") files)"
-        # clang-tidy counts on standard error what it does not show.
-        xargs -P "$jobs" -n 1 clang-tidy -p build/tidy --quiet --warnings-as-errors='*' <<< "$files" 2> build/tidy.log ||
-            found=1
-        grep -E 'error:|Error' build/tidy.log || true
-    done
-    return "$found"
+    scripts/tidy.py --jobs "$jobs" "${folders[@]}"
 }
 
 run_coverage() {
