@@ -4,7 +4,6 @@
 
 #include <algorithm>
 #include <charconv>
-#include <cmath>
 
 namespace kareport
 {
@@ -22,13 +21,29 @@ bool isDigit(char character)
     return character >= '0' && character <= '9';
 }
 
-/// A number too small for a double is 0; one too large is no number.
+/// The power of ten of a number's first digit that is not 0. @param text  digits, perhaps a sign, a point and an exponent
+qint64 powerOfTen(std::string_view text)
+{
+    constexpr qint64 farAway = qint64(1) << 60; ///< beyond what the digits of a text can make up for
+    const std::size_t mark = std::min(text.find_first_of("eE"), text.size());
+    const std::string_view digits = text.substr(0, mark);
+    std::string_view power = text.substr(std::min(mark + 1, text.size()));
+    const bool isNegative = power.starts_with('-');
+    power.remove_prefix(isNegative || power.starts_with('+') ? 1 : 0);
+    qint64 exponent = 0;
+    if (std::from_chars(power.data(), power.data() + power.size(), exponent).ec == std::errc::result_out_of_range) {
+        exponent = farAway;
+    }
+    const auto point = static_cast<qint64>(std::min(digits.find('.'), digits.size()));
+    const auto first = static_cast<qint64>(std::min(digits.find_first_of("123456789"), digits.size()));
+    return (isNegative ? -exponent : exponent) + (first < point ? point - first - 1 : point - first);
+}
+
+/// A number too small for a double is 0; one too large is no number. Not every system has a wider type to ask.
 bool parseOutOfRange(std::string_view text, double &number)
 {
-    long double wide = 0;
-    const auto result = std::from_chars(text.data(), text.data() + text.size(), wide);
-    number = static_cast<double>(wide);
-    return result.ec == std::errc() && std::isfinite(number);
+    number = text.starts_with('-') ? -0.0 : 0.0;
+    return powerOfTen(text) < 0;
 }
 
 /// Takes the digits at a position, with groups of three after a mark of thousands where there are such. @return whether they are groups

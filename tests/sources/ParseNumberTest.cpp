@@ -41,6 +41,8 @@ TEST(ParseNumber, ReadsWhatIsANumber)
         {"1.7976931348623157e308", 1.7976931348623157e308, "the largest number"},
         {"5e-324", 5e-324, "the smallest number"},
         {"1e-400", 0, "too small for a double is 0"},
+        {"-1e-5000", 0, "too small for any type"},
+        {"1e-99999999999999999999", 0, "an exponent that is no number itself"},
         {"INF", infinite, "infinite"},
         {"inf", infinite, "in small letters"},
         {"-INF", -infinite, "infinite below 0"},
@@ -56,6 +58,23 @@ TEST(ParseNumber, ReadsWhatIsANumber)
         EXPECT_TRUE(parseNumber(text, number)) << text;
         EXPECT_TRUE(std::isnan(number)) << text;
     }
+}
+
+TEST(ParseNumber, TellsTooSmallFromTooLargeByAllOfTheText)
+{
+    const std::string zeros(400, '0');
+    double number = -1;
+    EXPECT_TRUE(parseNumber("0." + zeros + "1", number));
+    EXPECT_EQ(number, 0) << "without an exponent";
+    EXPECT_TRUE(parseNumber("1" + zeros + "e-800", number));
+    EXPECT_EQ(number, 0) << "the exponent makes it smaller than the digits make it larger";
+    EXPECT_TRUE(parseNumber("0." + zeros + "1e401", number));
+    EXPECT_EQ(number, 1) << "both make up for each other";
+    EXPECT_TRUE(parseNumber("-1e-400", number));
+    EXPECT_TRUE(std::signbit(number)) << "a sign stays";
+    EXPECT_FALSE(parseNumber("0.00001e400", number));
+    EXPECT_FALSE(parseNumber("1" + zeros, number));
+    EXPECT_FALSE(parseNumber("0." + zeros + "1e900", number));
 }
 
 TEST(ParseNumber, RefusesWhatIsNotOne)
