@@ -2,6 +2,8 @@ include(CMakePackageConfigHelpers)
 
 # Three components: library, development, programs.
 install(TARGETS KaReportHost KaReport ka_package_headers ka_package EXPORT KaReportTargets
+        RUNTIME DESTINATION ${CMAKE_INSTALL_BINDIR} COMPONENT library
+        ARCHIVE DESTINATION ${CMAKE_INSTALL_LIBDIR} COMPONENT development
         LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR} COMPONENT library NAMELINK_COMPONENT development)
 # They name each other as the files beside them, so one include path serves: <KaReport/UReportDoc.h>.
 set(installed_headers)

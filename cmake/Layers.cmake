@@ -9,6 +9,9 @@ target_compile_options(ka_options INTERFACE
     -Woverloaded-virtual -Wundef -Wcast-align)
 # The libraries' own functions call each other directly, also where they are offered outside.
 target_compile_options(ka_options INTERFACE -fno-semantic-interposition)
+if(KA_SYSTEM STREQUAL Windows) # of its headers, the names that are needed
+    target_compile_definitions(ka_options INTERFACE NOMINMAX WIN32_LEAN_AND_MEAN)
+endif()
 if(KAREPORT_WERROR)
     target_compile_options(ka_options INTERFACE -Werror)
 endif()
@@ -98,6 +101,9 @@ endfunction()
 # The headers of a layer, with those of the layers that it links, as <target>_api.
 function(ka_api target)
     add_library(${target}_api INTERFACE)
+    if(KA_SYSTEM STREQUAL Windows)
+        target_compile_definitions(${target}_api INTERFACE KAREPORT_STATIC) # whoever sees it links it into itself
+    endif()
     target_include_directories(${target}_api INTERFACE ${CMAKE_CURRENT_SOURCE_DIR})
     foreach(link IN LISTS ARGN)
         if(TARGET ${link}_api)

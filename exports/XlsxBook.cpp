@@ -1,9 +1,8 @@
 #include "XlsxBook.h"
 
 #include "DataText.h"
+#include "SystemPath.h"
 #include "Xlate.h"
-
-#include <QFile>
 
 #include <clocale>
 #include <new>
@@ -94,13 +93,13 @@ XlsxBook::PlainNumbers::~PlainNumbers()
     }
 }
 
-XlsxBook::XlsxBook() : folderName_(QFile::encodeName(folder_.path()))
+XlsxBook::XlsxBook() : folderName_(pathForLibrary(folder_.path()))
 {
     lxw_workbook_options options = {};
     options.constant_memory = LXW_TRUE;
     options.tmpdir = folderName_.data();
     options.use_zip64 = LXW_FALSE;
-    book_ = notNull(workbook_new_opt(QFile::encodeName(path()).constData(), &options));
+    book_ = notNull(workbook_new_opt(pathForLibrary(path()).constData(), &options));
 }
 
 XlsxBook::~XlsxBook()

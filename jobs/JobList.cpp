@@ -2,11 +2,11 @@
 
 #include "FileBytes.h"
 #include "JsonPlaces.h"
+#include "StandardInput.h"
+#include "SystemPath.h"
 #include "Xlate.h"
 
-#include <QFile>
-
-#include <cstdio>
+#include <limits>
 
 namespace kareport
 {
@@ -49,16 +49,12 @@ Expected<QStringList> readJobList(const QString &path)
 {
     QByteArray bytes;
     if (path == u"-") {
-        QFile input;
-        if (!input.open(stdin, QIODevice::ReadOnly)) {
+        const StandardInput input = StandardInput::read(std::numeric_limits<std::size_t>::max());
+        if (input.error != 0) {
             return InputError{QString(), std::nullopt,
-                              Xlate("standard input cannot be read: %1").arg(input.errorString())};
+                              Xlate("standard input cannot be read: %1").arg(qt_error_string(input.error))};
         }
-        bytes = input.readAll();
-        if (input.error() != QFileDevice::NoError) {
-            return InputError{QString(), std::nullopt,
-                              Xlate("standard input cannot be read: %1").arg(input.errorString())};
-        }
+        bytes = input.bytes;
     } else {
         const auto file = FileBytes::open(path);
         if (const InputError *error = errorOf(file)) {
@@ -82,7 +78,7 @@ Expected<QStringList> readJobList(const QString &path)
             name.chop(1);
         }
         if (!name.trimmed().isEmpty()) {
-            jobs.append(QFile::decodeName(name));
+            jobs.append(textOfSystem(name));
         }
     }
     return jobs;

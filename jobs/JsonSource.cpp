@@ -1,6 +1,7 @@
 #include "JsonSource.h"
 
 #include "NearestName.h"
+#include "StandardInput.h"
 #include "Xlate.h"
 
 #include <QFile>
@@ -9,7 +10,6 @@
 #include <QStringList>
 
 #include <algorithm>
-#include <cstdio>
 #include <variant>
 
 namespace kareport
@@ -97,12 +97,16 @@ std::optional<QJsonValue> withValueAt(const QJsonValue &value, const QStringList
 Expected<JsonSource> JsonSource::read(const QString &path)
 {
     QFile file(path);
-    if (path == u"-" ? !file.open(stdin, QIODevice::ReadOnly) : !file.open(QIODevice::ReadOnly)) {
+    QByteArray bytes;
+    qint64 size = 0; // a pipe has none, and may never end
+    if (path == u"-") {
+        bytes = StandardInput::read(largestJob + 1).bytes;
+    } else if (file.open(QIODevice::ReadOnly)) {
+        size = file.size();
+        bytes = size > largestJob ? QByteArray() : file.read(size > 0 ? size : largestJob + 1);
+    } else {
         return InputError{path, std::nullopt, Xlate("the file cannot be read: %1").arg(file.errorString())};
     }
-    // A pipe has no size, and may never end.
-    const qint64 size = path == u"-" ? 0 : file.size();
-    const QByteArray bytes = size > largestJob ? QByteArray() : file.read(size > 0 ? size : largestJob + 1);
     if (std::max<qint64>(size, bytes.size()) > largestJob) {
         return InputError{path, TextPlace(),
                           Xlate("the file is larger than %1 MB: a job was expected").arg(largestJob >> 20)};

@@ -13,4 +13,8 @@ void prepareProcess();
 /// Whether standard output leads to a pipe without a reader.
 bool isOutputReaderGone();
 
+/// Lets Qt use the faces that come with the programs, where no package of the system brings them. An application must be
+/// there.
+void addShippedFaces();
+
 } // namespace kareport

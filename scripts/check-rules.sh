@@ -15,7 +15,15 @@ sources=$(find host templates groups page formats report print view ui geometry 
 report 'Headers are included by their name alone, so that layers hold:' \
     "$(grep -nE '#include "(\.\./|[a-z]+/)' $sources || true)"
 report 'Operating-system headers belong into files named for the system (Posix or Windows in their names):' \
-    "$(grep -nE '#include <(unistd|fcntl|sys/[a-z]+|windows|pthread)(\.h)?>' $sources | grep -vE '(Posix|Windows)[A-Za-z]*\.(cpp|h):' || true)"
+    "$(grep -nE '#include <(unistd|fcntl|poll|io|sys/[a-z]+|windows|winsock2|sh[a-z]+api|shlobj|pthread)(\.h)?>' $sources | grep -vE '(Posix|Windows)[A-Za-z]*\.(cpp|h):' || true)"
+report 'Nothing asks which system it is: what differs is in a pair of files, ...Posix.cpp and ...Windows.cpp, behind one header:' \
+    "$(grep -nE '^ *# *(if|ifdef|ifndef|elif)\b.*\b(_?WIN(32|64)|_MSC_VER|__MINGW[0-9A-Z_]*|__(linux|unix|APPLE)__|Q_OS_[A-Z0-9]+|Q_CC_[A-Z]+)\b' $sources || true)"
+report 'Each half of a pair has the other one and its header:' \
+    "$(for half in $(printf '%s\n' $sources | grep -vE '^(tests|bench|fuzz|tools|examples)/' | grep 'Posix\.cpp$'); do
+        for other in "${half%Posix.cpp}Windows.cpp" "${half%Posix.cpp}.h"; do
+            [ -e "$other" ] || echo "$other"
+        done
+    done)"
 report 'A test is not skipped without a reason:' \
     "$(grep -nE 'GTEST_SKIP\(\);|DISABLED_' $sources || true)"
 report 'No shell is started:' \

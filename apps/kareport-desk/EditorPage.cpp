@@ -87,7 +87,7 @@ bool EditorPage::confirm()
 
 void EditorPage::browse()
 {
-    const QString start = editor().isEmpty() ? QStringLiteral("/usr/bin") : editor();
+    const QString start = editor().isEmpty() ? programsFolder() : editor();
     const QString program = QFileDialog::getOpenFileName(this, Xlate("Choose a program"), start);
     if (!program.isEmpty()) {
         editor_->setEditText(program);

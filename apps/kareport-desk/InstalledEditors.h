@@ -15,8 +15,11 @@ struct InstalledEditor
     QString path; ///< full path
 };
 
-/// The programs with a window of their own that say that they open plain or rich text, by their names.
-/// @param folders  where programs are described (*.desktop); empty for the system's
+/// The programs with a window of their own that the system knows to open plain or rich text, by their names.
+/// @param folders  where programs are described, on systems that have such descriptions (*.desktop); empty for the system's
 std::vector<InstalledEditor> installedEditors(const QStringList &folders = {});
+
+/// Where a user begins to look for programs that are not in the list.
+QString programsFolder();
 
 } // namespace kareport

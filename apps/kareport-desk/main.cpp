@@ -13,6 +13,7 @@ int main(int argc, char **argv)
 {
     kareport::prepareProcess();
     QApplication application(argc, argv);
+    kareport::addShippedFaces();
     QApplication::setApplicationName(QStringLiteral("KaReport"));
     QApplication::setApplicationVersion(QStringLiteral(KAREPORT_VERSION));
     QApplication::setDesktopFileName(QStringLiteral("kareport-desk"));

@@ -1,6 +1,7 @@
 #include "CommandOptions.h"
 
 #include "OutputKind.h"
+#include "SystemPath.h"
 
 namespace kareport
 {
@@ -119,7 +120,7 @@ CommandWords wordsOf(const CLI::App &command, const ValueKinds &kinds)
 
 QString textOf(const std::string &word)
 {
-    return QString::fromLocal8Bit(word.data(), static_cast<qsizetype>(word.size()));
+    return kareport::textOfSystem(QByteArray(word.data(), static_cast<qsizetype>(word.size())));
 }
 
 QStringList textsOf(const std::vector<std::string> &words)
@@ -183,6 +184,7 @@ NewCommand NewWords::command() const
 CommandLine::CommandLine()
 {
     program.name("kareport");
+    program.allow_windows_style_options(false); // a word that begins with a slash is a file
     program.set_version_flag("--version", "kareport " KAREPORT_VERSION);
     program.require_subcommand(1);
     program.footer("Exit status: 0 done, 1 wrong command line, 2 wrong input (nothing of it is written), "

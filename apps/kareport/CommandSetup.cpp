@@ -1,7 +1,9 @@
 #include "CommandSetup.h"
 
+#include "Display.h"
 #include "NearestName.h"
 #include "OutputKind.h"
+#include "ProcessSetup.h"
 #include "Signals.h"
 #include "Xlate.h"
 
@@ -63,8 +65,10 @@ std::unique_ptr<QCoreApplication> startQt(int &argc, char **argv, bool withFonts
         return std::make_unique<QCoreApplication>(argc, argv);
     }
     // Fonts need an application with a platform, but no screen.
-    qputenv("QT_QPA_PLATFORM", "offscreen");
-    return std::make_unique<QGuiApplication>(argc, argv);
+    qputenv("QT_QPA_PLATFORM", platformWithoutWindows());
+    auto application = std::make_unique<QGuiApplication>(argc, argv);
+    addShippedFaces();
+    return application;
 }
 
 } // namespace kareport

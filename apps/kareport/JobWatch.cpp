@@ -11,7 +11,6 @@
 #include <QDir>
 #include <QElapsedTimer>
 #include <QFileInfo>
-#include <QSocketNotifier>
 #include <QTime>
 #include <QTimer>
 
@@ -82,14 +81,11 @@ ExitStatus JobWatch::run()
     if (first == exitInterrupted || first == exitUsage) {
         return first;
     }
-    const int interrupts = interruptDescriptor();
-    if (interrupts < 0) {
+    if (!callOnInterrupt(QCoreApplication::instance(), [] { QCoreApplication::exit(0); })) {
         printError(Xlate("kareport: the system has no more descriptors"));
         return exitOutput;
     }
     sayWatched();
-    QSocketNotifier notifier(interrupts, QSocketNotifier::Read);
-    QObject::connect(&notifier, &QSocketNotifier::activated, [] { QCoreApplication::exit(0); });
     QCoreApplication::exec();
     return exitInterrupted;
 }

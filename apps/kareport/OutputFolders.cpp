@@ -1,9 +1,9 @@
 #include "OutputFolders.h"
 
 #include "LinkTarget.h"
+#include "SystemPath.h"
 #include "Xlate.h"
 
-#include <QFile>
 #include <QFileInfo>
 
 #include <filesystem>
@@ -52,7 +52,7 @@ QString missingFolder(const QString &file)
 std::optional<QString> makeFolders(const QString &folder)
 {
     std::error_code error;
-    std::filesystem::create_directories(QFile::encodeName(folder).toStdString(), error);
+    std::filesystem::create_directories(standardPath(folder), error);
     return error ? std::optional(QString::fromLocal8Bit(error.message().c_str())) : std::nullopt;
 }
 

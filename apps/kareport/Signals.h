@@ -1,5 +1,9 @@
 #pragma once
 
+#include <functional>
+
+class QObject;
+
 namespace kareport
 {
 
@@ -8,9 +12,11 @@ namespace kareport
 /// the program where it is: a file that is half written is taken away. Signals that the caller has switched off stay so.
 void catchInterrupts();
 
-/// A descriptor that can be read as soon as a signal asks the program to end, for a program that waits in an event loop. It
-/// stays open. @return -1 when the system gives none
-int interruptDescriptor();
+/// Calls something in the event loop as soon as a signal asks the program to end, for a program that waits there; at once when
+/// one has come already.
+/// @param context  it is called as long as this lives
+/// @return false when the system has no descriptor left for it
+bool callOnInterrupt(QObject *context, std::function<void()> called);
 
 /// Ends the program by the signal that interrupted it, so that a shell knows why, and ends its loop as well. Returns when
 /// there was none.

@@ -4,6 +4,8 @@
 #include "TerminalProgress.h"
 #include "UnfinishedFile.h"
 
+#include <QSocketNotifier>
+
 #include <atomic>
 #include <csignal>
 #include <ctime>
@@ -11,6 +13,7 @@
 #include <initializer_list>
 #include <string_view>
 #include <unistd.h>
+#include <utility>
 
 namespace kareport
 {
@@ -104,17 +107,19 @@ void catchInterrupts()
     handle(SIGPIPE, endForClosedReader);
 }
 
-int interruptDescriptor()
+bool callOnInterrupt(QObject *context, std::function<void()> called)
 {
     int ends[2];
     if (pipe2(ends, O_CLOEXEC | O_NONBLOCK) != 0) {
-        return -1;
+        return false;
     }
-    interruptPipe = ends[1];
+    interruptPipe = ends[1]; // both stay open
     if (interruptingSignal != 0) {
         [[maybe_unused]] const ssize_t written = write(interruptPipe, "", 1);
     }
-    return ends[0];
+    auto *const notifier = new QSocketNotifier(ends[0], QSocketNotifier::Read, context);
+    QObject::connect(notifier, &QSocketNotifier::activated, notifier, std::move(called));
+    return true;
 }
 
 void endByInterrupt()

@@ -1,5 +1,6 @@
 #include "Commands.h"
 
+#include "Display.h"
 #include "FileKind.h"
 #include "Xlate.h"
 
@@ -20,12 +21,6 @@ QString deskProgram()
     const QString name = QStringLiteral("kareport-desk");
     const QString beside = QStandardPaths::findExecutable(name, {QCoreApplication::applicationDirPath()});
     return beside.isEmpty() ? QStandardPaths::findExecutable(name) : beside;
-}
-
-bool hasDisplay()
-{
-    return qEnvironmentVariableIsSet("QT_QPA_PLATFORM") || !qEnvironmentVariableIsEmpty("DISPLAY") ||
-           !qEnvironmentVariableIsEmpty("WAYLAND_DISPLAY");
 }
 
 ExitStatus fail(ExitStatus status, const QString &text)

@@ -4,6 +4,7 @@
 #include "Completion.h"
 #include "NearestName.h"
 #include "ProcessSetup.h"
+#include "ProgramArguments.h"
 #include "Signals.h"
 #include "Xlate.h"
 
@@ -145,7 +146,8 @@ int main(int argc, char **argv)
 {
     try {
         kareport::prepareProcess();
-        return finish(runProgram(argc, argv));
+        auto [count, words] = kareport::ProgramArguments::of(argc, argv);
+        return finish(runProgram(count, words));
     } catch (const std::bad_alloc &) {
         // Without memory, no text can be put together either.
         std::fputs("kareport: error: there is not enough memory for this input\n", stderr);

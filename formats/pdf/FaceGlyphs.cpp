@@ -1,9 +1,6 @@
 #include "FaceGlyphs.h"
 
-#include <QFile>
-
-#include <ft2build.h>
-#include FT_FREETYPE_H
+#include "FaceFiles.h"
 
 #include <algorithm>
 
@@ -12,6 +9,7 @@ namespace kareport
 
 struct FaceGlyphs::Face
 {
+    QByteArray bytes; ///< of a face that is read from memory
     FT_Library library = nullptr;
     FT_Face face = nullptr;
 
@@ -31,9 +29,8 @@ struct FaceGlyphs::Face
 
 FaceGlyphs::FaceGlyphs(const PdfFace &face) : face_(std::make_unique<Face>())
 {
-    const QByteArray file = QFile::encodeName(face.file());
     if (FT_Init_FreeType(&face_->library) == 0) {
-        FT_New_Face(face_->library, file.constData(), static_cast<FT_Long>(face.index()), &face_->face);
+        face_->face = openFaceFile(face_->library, face.file(), face.index(), face_->bytes);
     }
 }
 

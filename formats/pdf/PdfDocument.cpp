@@ -1,6 +1,7 @@
 #include "PdfDocument.h"
 
-#include <QFile>
+#include "FaceFiles.h"
+
 #include <QIODevice>
 
 #include <hpdf_doc.h>
@@ -92,10 +93,7 @@ HPDF_Font PdfDocument::loadFace(const PdfFace &face)
     if (!isGood()) {
         return nullptr;
     }
-    const QByteArray file = QFile::encodeName(face.file());
-    const char *name = face.isCollection()
-                           ? HPDF_LoadTTFontFromFile2(document_, file.constData(), face.index(), HPDF_TRUE)
-                           : HPDF_LoadTTFontFromFile(document_, file.constData(), HPDF_TRUE);
+    const char *name = embedFaceFile(document_, face);
     const HPDF_FontDef definition = name != nullptr ? HPDF_GetFontDef(document_, name) : nullptr;
     if (!isGood() || definition == nullptr) {
         return nullptr;

@@ -1,7 +1,8 @@
 #include "PdfFaces.h"
-#include "FixedPitchFont.h"
 
-#include <QFile>
+#include "FaceFiles.h"
+#include "FixedPitchFont.h"
+#include "SystemPath.h"
 
 #include <fontconfig/fontconfig.h>
 
@@ -26,12 +27,6 @@ namespace
 
 using PatternOwner = std::unique_ptr<FcPattern, decltype(&FcPatternDestroy)>;
 using FontSetOwner = std::unique_ptr<FcFontSet, decltype(&FcFontSetDestroy)>;
-using ObjectSetOwner = std::unique_ptr<FcObjectSet, decltype(&FcObjectSetDestroy)>;
-
-const FcChar8 *fcText(const QByteArray &text)
-{
-    return reinterpret_cast<const FcChar8 *>(text.constData());
-}
 
 std::shared_ptr<const PdfFace::Coverage> coverageOf(const FcPattern *pattern)
 {
@@ -45,22 +40,14 @@ std::shared_ptr<const PdfFace::Coverage> coverageOf(const FcPattern *pattern)
 
 std::shared_ptr<const PdfFace::Coverage> coverageOf(const QString &file, unsigned index)
 {
-    int count = 0;
-    const PatternOwner pattern(FcFreeTypeQuery(fcText(QFile::encodeName(file)), index, nullptr, &count),
-                               &FcPatternDestroy);
+    const PatternOwner pattern(describeFace(file, index), &FcPatternDestroy);
     return coverageOf(pattern.get());
 }
 
 /// The upright regular face of a family; nothing where the system does not have it as a TrueType file.
 std::optional<PdfFace> faceOfFamily(const char *family)
 {
-    const PatternOwner pattern(FcPatternCreate(), &FcPatternDestroy);
-    FcPatternAddString(pattern.get(), FC_FAMILY, reinterpret_cast<const FcChar8 *>(family));
-    FcPatternAddInteger(pattern.get(), FC_SLANT, FC_SLANT_ROMAN);
-    FcPatternAddString(pattern.get(), FC_FONTFORMAT, reinterpret_cast<const FcChar8 *>("TrueType"));
-    const ObjectSetOwner wanted(FcObjectSetBuild(FC_FILE, FC_INDEX, FC_WEIGHT, FC_CHARSET, nullptr),
-                                &FcObjectSetDestroy);
-    const FontSetOwner found(FcFontList(nullptr, pattern.get(), wanted.get()), &FcFontSetDestroy);
+    const FontSetOwner found(facesOfFamily(family), &FcFontSetDestroy);
 
     struct Found
     {
@@ -81,7 +68,7 @@ std::optional<PdfFace> faceOfFamily(const char *family)
             continue;
         }
         // Of several files the first by name is taken, so that the choice does not depend on the order of a folder.
-        const QString name = QFile::decodeName(reinterpret_cast<const char *>(file));
+        const QString name = textOfSystem(reinterpret_cast<const char *>(file));
         if (!best || name < best->file) {
             best = Found{name, index, found->fonts[i]};
         }
@@ -117,19 +104,6 @@ bool PdfFace::covers(char32_t character) const
 {
     return character <= 0xFFFF && coverage_->characters != nullptr &&
            FcCharSetHasChar(coverage_->characters, character) == FcTrue;
-}
-
-QStringList systemFontFolders()
-{
-    QStringList folders;
-    FcStrList *list = FcConfigGetFontDirs(nullptr);
-    while (const FcChar8 *folder = list != nullptr ? FcStrListNext(list) : nullptr) {
-        folders.append(QFile::decodeName(reinterpret_cast<const char *>(folder)));
-    }
-    if (list != nullptr) {
-        FcStrListDone(list);
-    }
-    return folders;
 }
 
 std::vector<PdfFace> fixedPitchPdfFaces()

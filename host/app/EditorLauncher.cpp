@@ -1,5 +1,6 @@
 #include "EditorLauncher.h"
 
+#include <QDir>
 #include <QFileInfo>
 #include <QProcess>
 
@@ -21,8 +22,9 @@ void launchEditor(const QString &program, const QString &file, const QString &fo
 {
     // A relative path would be looked for in the program's folder; a bare name of a program even along the search path,
     // and one of a file that begins with "-" would be read as an option.
-    const EditorLaunch launch{QFileInfo(program).absoluteFilePath(), QFileInfo(file).absoluteFilePath(), folder,
-                              document};
+    // Programs of a system whose separator is another one may read a slash as the beginning of an option as well.
+    const EditorLaunch launch{QFileInfo(program).absoluteFilePath(),
+                              QDir::toNativeSeparators(QFileInfo(file).absoluteFilePath()), folder, document};
     if (editorLauncher()) {
         editorLauncher()(launch);
     } else {

@@ -1,5 +1,6 @@
 #include "LinkTarget.h"
 
+#include "LinkOwnersPosix.h"
 #include "Xlate.h"
 
 #include <QDir>

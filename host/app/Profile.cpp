@@ -1,6 +1,7 @@
 #include "Profile.h"
 
 #include "MemoryLasts.h"
+#include "UserSettings.h"
 
 #include <QHashFunctions>
 #include <QSettings>
@@ -23,8 +24,7 @@ class SettingsProfile : public ProfileStore
 {
 public:
     explicit SettingsProfile(const QString &path)
-        : settings_(path.isEmpty() ? std::make_unique<QSettings>(QStringLiteral("KaReport"), QStringLiteral("KaReport"))
-                                   : std::make_unique<QSettings>(path, QSettings::IniFormat))
+        : settings_(path.isEmpty() ? userSettings() : std::make_unique<QSettings>(path, QSettings::IniFormat))
     {}
 
     QString read(const QString &section, const QString &entry, const QString &fallback) const override

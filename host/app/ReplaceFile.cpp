@@ -1,12 +1,12 @@
 #include "ReplaceFile.h"
 
+#include "DevicePath.h"
 #include "LinkTarget.h"
 #include "UnfinishedFile.h"
 #include "WriteFailure.h"
 #include "Xlate.h"
 
 #include <QFile>
-#include <QFileInfo>
 #include <QSaveFile>
 
 namespace kareport
@@ -38,10 +38,10 @@ bool replaceFile(const QString &path, const std::function<bool(QIODevice &)> &wr
     if (target.isEmpty() && !path.isEmpty()) {
         return false;
     }
-    const QFileInfo info(path);
-    if (info.exists() && !info.isFile() && !info.isDir()) {
-        // A pipe or a device is written to: putting a file into its place would destroy it.
-        QFile file(path);
+    const QString device = devicePath(path);
+    if (!device.isEmpty()) {
+        // It is written to: putting a file into its place would destroy it.
+        QFile file(device);
         const bool done = file.open(QIODevice::WriteOnly) && write(file) && file.flush();
         return finish(done, error, file.errorString());
     }

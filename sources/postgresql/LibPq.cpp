@@ -1,5 +1,7 @@
 #include "LibPq.h"
 
+#include "LibPqName.h"
+
 #include <QLibrary>
 
 namespace kareport
@@ -29,8 +31,8 @@ private:
 
 LibPq load()
 {
-    constexpr int version = 5;
-    QLibrary library(QStringLiteral("pq"), version);
+    QLibrary library;
+    setLibPqName(library);
     Finder finder(library);
     LibPq pq;
     finder.find(pq.clear, "PQclear");

@@ -1,3 +1,4 @@
+#include "LinkOwnersPosix.h"
 #include "LinkTarget.h"
 #include "ReplaceFile.h"
 #include "UnfinishedFile.h"

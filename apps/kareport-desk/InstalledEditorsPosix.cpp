@@ -85,4 +85,9 @@ std::vector<InstalledEditor> installedEditors(const QStringList &folders)
     return editors;
 }
 
+QString programsFolder()
+{
+    return QStringLiteral("/usr/bin");
+}
+
 } // namespace kareport

@@ -1,14 +1,12 @@
 #include "FileBytes.h"
 
-#include "Interrupt.h"
+#include "InputHandle.h"
 #include "Xlate.h"
 
 #include <algorithm>
 #include <array>
 #include <cerrno>
-#include <fcntl.h>
 #include <system_error>
-#include <unistd.h>
 
 namespace kareport
 {
@@ -33,36 +31,16 @@ QString cutShort()
     return Xlate("the file was cut short while it was read");
 }
 
-/// Opens a file as the system does. Qt's own opening goes on waiting for a pipe's writer when a signal comes.
-int openHandle(const QString &path)
-{
-    int handle = -1;
-    do {
-        handle = ::open(QFile::encodeName(path).constData(), O_RDONLY | O_CLOEXEC);
-    } while (handle < 0 && errno == EINTR && !isInterrupted());
-    return handle;
-}
-
-/// @return the bytes that were read, 0 at the end, and below 0 when reading fails or the program is interrupted
-ssize_t readSome(int handle, char *to, std::size_t most)
-{
-    ssize_t count = -1;
-    do {
-        count = ::read(handle, to, most);
-    } while (count < 0 && errno == EINTR && !isInterrupted());
-    return count;
-}
-
 } // namespace
 
 Expected<std::shared_ptr<const FileBytes>> FileBytes::open(const QString &path)
 {
-    return ofHandle(path, openHandle(path));
+    return ofHandle(path, openForReading(path));
 }
 
 Expected<std::shared_ptr<const FileBytes>> FileBytes::openStandardInput()
 {
-    return ofHandle(QStringLiteral("-"), ::fcntl(STDIN_FILENO, F_DUPFD_CLOEXEC, 0));
+    return ofHandle(QStringLiteral("-"), kareport::openStandardInput());
 }
 
 /// The bytes of what was opened, which is closed after it; a handle below 0 stands for what could not be opened.
@@ -75,8 +53,7 @@ Expected<std::shared_ptr<const FileBytes>> FileBytes::ofHandle(const QString &pa
     }
     bytes->file_.open(handle, QIODevice::ReadOnly | QIODevice::Unbuffered, QFileDevice::AutoCloseHandle);
     // Of what was read in part already, as standard input may be, the rest counts.
-    const bool isAtStart = ::lseek(handle, 0, SEEK_CUR) <= 0;
-    const qint64 size = isAtStart ? bytes->file_.size() : 0;
+    const qint64 size = isAtStart(handle) ? bytes->file_.size() : 0;
     if (size >= smallestMapped && bytes->mapped_.map(handle, static_cast<std::size_t>(size))) {
         bytes->view_ = bytes->mapped_.view();
         return std::shared_ptr<const FileBytes>(std::move(bytes));
@@ -113,7 +90,7 @@ std::optional<QString> FileBytes::read(qint64 size)
 {
     content_.resize(size);
     qsizetype used = 0;
-    for (ssize_t count = 1; count > 0 && used < size; used += std::max<ssize_t>(count, 0)) {
+    for (qint64 count = 1; count > 0 && used < size; used += std::max<qint64>(count, 0)) {
         count = readSome(file_.handle(), content_.data() + used, static_cast<std::size_t>(size - used));
         if (count < 0) {
             return systemReason();
@@ -127,7 +104,7 @@ std::optional<QString> FileBytes::read(qint64 size)
 std::optional<QString> FileBytes::readPipe()
 {
     std::array<char, pipeRoom> room;
-    for (ssize_t count = 1; count > 0;) {
+    for (qint64 count = 1; count > 0;) {
         count = readSome(file_.handle(), room.data(), room.size());
         if (count < 0) {
             return systemReason();
