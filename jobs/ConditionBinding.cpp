@@ -1,5 +1,6 @@
 #include "ConditionBinding.h"
 
+#include "EntryOrder.h"
 #include "Measures.h"
 #include "Xlate.h"
 

@@ -39,16 +39,4 @@ bool isAdded(int type)
     return isNumeric(type) && type != VARIABLE_THICKNESS && type != VARIABLE_BEARING;
 }
 
-std::optional<double> numberOf(const UDictEntry *entry)
-{
-    if (entry == nullptr) {
-        return std::nullopt;
-    }
-    if (const auto *number = std::get_if<double>(&entry->value())) {
-        return *number;
-    }
-    const auto *whole = std::get_if<qint32>(&entry->value());
-    return whole != nullptr ? std::optional(static_cast<double>(*whole)) : std::nullopt;
-}
-
 } // namespace kareport

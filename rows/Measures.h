@@ -1,9 +1,5 @@
 #pragma once
 
-#include "UDictEntry.h"
-
-#include <optional>
-
 namespace kareport
 {
 
@@ -24,8 +20,5 @@ Measure measureOf(int type);
 bool isNumeric(int type);
 /// Whether values of a type can be added up: a sum of directions says nothing.
 bool isAdded(int type);
-
-/// The number that an entry holds; nothing for null and for any other value.
-std::optional<double> numberOf(const UDictEntry *entry);
 
 } // namespace kareport

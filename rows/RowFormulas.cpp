@@ -1,7 +1,7 @@
 #include "RowFormulas.h"
 
 #include "DecimalSum.h"
-#include "Measures.h"
+#include "EntryOrder.h"
 
 #include <algorithm>
 #include <cmath>

@@ -1,6 +1,6 @@
 #include "RunningValues.h"
 
-#include "Measures.h"
+#include "EntryOrder.h"
 #include "RowFormulas.h"
 #include "VariableType.h"
 

@@ -1,7 +1,6 @@
 #include "EntryOrder.h"
 
 #include <cmath>
-#include <optional>
 
 namespace kareport
 {
@@ -14,17 +13,11 @@ std::weak_ordering compareFolded(QStringView left, QStringView right)
     return left.compare(right, Qt::CaseInsensitive) <=> 0;
 }
 
-std::optional<double> numberOf(const UDictEntry &entry)
+/// Where an entry stands among the numbers, true and false as 1 and 0; nothing where it is no number.
+std::optional<double> rankOf(const UDictEntry &entry)
 {
-    return std::visit(
-        [](const auto &held) -> std::optional<double> {
-            if constexpr (std::is_arithmetic_v<std::decay_t<decltype(held)>>) {
-                return static_cast<double>(held);
-            } else {
-                return std::nullopt;
-            }
-        },
-        entry.value());
+    const bool *truth = std::get_if<bool>(&entry.value());
+    return truth != nullptr ? std::optional(*truth ? 1.0 : 0.0) : numberOf(&entry);
 }
 
 std::weak_ordering compareNumbers(double left, double right)
@@ -73,6 +66,23 @@ std::weak_ordering compareDigitRuns(QStringView left, QStringView right)
 
 } // namespace
 
+std::optional<double> numberOf(const UDictEntry *entry)
+{
+    if (entry == nullptr) {
+        return std::nullopt;
+    }
+    return std::visit(
+        [](const auto &held) -> std::optional<double> {
+            using Held = std::decay_t<decltype(held)>;
+            if constexpr (std::is_arithmetic_v<Held> && !std::is_same_v<Held, bool>) {
+                return static_cast<double>(held);
+            } else {
+                return std::nullopt;
+            }
+        },
+        entry->value());
+}
+
 std::weak_ordering compareNaturally(QStringView left, QStringView right)
 {
     while (!left.isEmpty() && !right.isEmpty()) {
@@ -96,8 +106,8 @@ std::weak_ordering compareEntries(const UDictEntry *left, const UDictEntry *righ
     if (left == nullptr || right == nullptr) {
         return (left != nullptr) <=> (right != nullptr);
     }
-    const auto leftNumber = numberOf(*left);
-    const auto rightNumber = numberOf(*right);
+    const auto leftNumber = rankOf(*left);
+    const auto rightNumber = rankOf(*right);
     if (leftNumber && rightNumber) {
         return compareNumbers(*leftNumber, *rightNumber);
     }

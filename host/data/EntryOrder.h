@@ -5,13 +5,17 @@
 #include <QStringView>
 
 #include <compare>
+#include <optional>
 #include <vector>
 
 namespace kareport
 {
 
+/// The number that an entry holds; nothing for null, for true and false, and for a text.
+std::optional<double> numberOf(const UDictEntry *entry);
+
 /// The order of two values; null means a missing entry. A missing one comes first, then numbers by their value,
-/// then texts by their case-folded characters, then point numbers in natural order. Not-a-number comes before all other
+/// true and false among them as 1 and 0, then texts by their case-folded characters, then point numbers in natural order. Not-a-number comes before all other
 /// numbers, so that the order stays one.
 std::weak_ordering compareEntries(const UDictEntry *left, const UDictEntry *right);
 
