@@ -35,6 +35,8 @@ report 'A tool tip of an item, or at a place, goes through plainToolTip:' \
     "$(grep -nE 'ToolTipRole|QToolTip::showText' $sources | grep -vE '^tests/|plainToolTip' || true)"
 report 'A progress dialog shows what it does in a label of its own that is plain (setLabel):' \
     "$(grep -lE '\bQProgressDialog [a-z]|new QProgressDialog' $sources | xargs -r grep -L 'setLabel(plainLabel' || true)"
+report 'Reports that a program was tried with do not stay in the root:' \
+    "$(find . -maxdepth 1 -type f -regex '.*\.\(rep\|rtf\|pdf\|csv\|html\|xlsx\|jsonl\)' | sort)"
 report 'Every header guards itself:' \
     "$(for header in $(printf '%s\n' $sources | grep '\.h$'); do head -n 1 "$header" | grep -q '#pragma once' || echo "$header"; done)"
 report 'Every header that a host includes stands in its guide (those of the records together):' \

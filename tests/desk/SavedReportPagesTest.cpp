@@ -9,6 +9,7 @@
 #include "UReportView.h"
 
 #include <QBuffer>
+#include <QFile>
 #include <QTextBlock>
 
 #include <gtest/gtest.h>
@@ -128,6 +129,31 @@ TEST(SavedReportPages, ReturnsWithinLinesDoNotHoldAPageLengthOfAnOlderText)
     files.put("a.rep", "\xEF\xBB\xBFone\r\r\ntwo\r\r\n");
     ASSERT_TRUE(kareport::reloadSavedReport(*report));
     EXPECT_FALSE(report->IsPageFixed()) << "as if it were opened now";
+}
+
+TEST(SavedReportText, ComesBackAsTheGuideAndTheManualPageSay)
+{
+    const QString text = QStringLiteral("TALVEN  \u00E9 \u4E2D \U0001F600\r\n\r\n  two  blanks\tand a tab \r\n") +
+                         QStringLiteral("1\u00A0234\r\n\r\n\r\n").repeated(3) + QStringLiteral("the last line\r\n");
+    const JobFolder files;
+    const QString path = files.path("a.rep");
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    UReportDoc *report = CreateReport(QStringLiteral("R"), false, false, nullptr, 0, nullptr);
+    report->SetData(text);
+    ASSERT_TRUE(report->OnSaveDocument(path));
+    for (int turn = 1; turn <= 2; ++turn) {
+        UReportDoc *opened = kareport::openSavedReport(path);
+        ASSERT_NE(opened, nullptr);
+        EXPECT_EQ(opened->CopyText(), text) << "opened " << turn << " times";
+        ASSERT_TRUE(opened->OnSaveDocument(path));
+        opened->OnCloseDocument();
+    }
+    for (const char *page : {"/../docs/guide-desk.md", "/../docs/kareport-desk.1"}) {
+        QFile file(QStringLiteral(KAREPORT_TEST_DIR) + QLatin1StringView(page));
+        ASSERT_TRUE(file.open(QIODevice::ReadOnly)) << page;
+        EXPECT_TRUE(file.readAll().contains("comes back as it was before it was saved")) << page;
+    }
 }
 
 } // namespace
