@@ -30,6 +30,27 @@ UReportDoc *makeReport(const QString &title, const QString &text, bool isModifie
     return report;
 }
 
+/// A rich text whose formats are in its view, with a letter typed into it.
+UReportDoc *editedRichText()
+{
+    UReportDoc *report = makeReport(QStringLiteral("R"), QStringLiteral("{\\rtf1 {\\b bold}}"));
+    QTest::keyClick(&dynamic_cast<UReportView *>(report->GetViews().front())->GetEdit(), Qt::Key_X);
+    return report;
+}
+
+/// Starts a desk, has something done there, keeps what is open, and ends the program as a crash does.
+/// @param work  is given the desk and what keeps its reports
+template <typename Work>
+void crashAfter(const CrashFolder &folder, const Work &work)
+{
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    auto recovery = std::make_unique<Recovery>(folder.path());
+    work(desk, *recovery);
+    recovery->keep();
+    folder.crash(std::move(recovery));
+}
+
 TEST(Recovery, WhatWasOpenComesBackAfterACrash)
 {
     const JobFolder files;
@@ -37,19 +58,14 @@ TEST(Recovery, WhatWasOpenComesBackAfterACrash)
     files.put("edited.rep", "TALVEN old\r\r\n");
     const CrashFolder folder;
     const QString text = QStringLiteral("a\r\n\u00E9 \u4E2D \U0001F600\r\nlast without an end");
-    {
-        Desk desk;
-        desk.answer = MessageAnswer::No;
-        auto recovery = std::make_unique<Recovery>(folder.path());
-        EXPECT_TRUE(recovery->leftReports().empty());
+    crashAfter(folder, [&](Desk &desk, Recovery &recovery) {
+        EXPECT_TRUE(recovery.leftReports().empty());
         makeReport(QStringLiteral("Traverse"), text);
         makeReport(QStringLiteral("Untouched"), QString(), false);
         ASSERT_TRUE(desk.frame->OpenFile(files.path("saved.rep")));
         ASSERT_TRUE(desk.frame->OpenFile(files.path("edited.rep")));
         Desk::reports().back()->WriteLine(QStringLiteral("new"), 0, 1, 0);
-        recovery->keep();
-        folder.crash(std::move(recovery));
-    }
+    });
     Desk desk;
     desk.answer = MessageAnswer::No;
     Recovery recovery(folder.path());
@@ -85,10 +101,7 @@ TEST(Recovery, PagesComeBack)
     const JobFolder files;
     const CrashFolder folder;
     std::vector<qint64> starts;
-    {
-        Desk desk;
-        desk.answer = MessageAnswer::No;
-        auto recovery = std::make_unique<Recovery>(folder.path());
+    crashAfter(folder, [&](Desk &, Recovery &) {
         UReportDoc *report = makeReport(QStringLiteral("R"), QString());
         report->FixPage(7, 80);
         for (int page = 0; page < 4; ++page) {
@@ -97,9 +110,7 @@ TEST(Recovery, PagesComeBack)
         }
         report->ReplaceText(report->GetPageStarts().at(2), 0, u"x\r\nno longer full pages");
         starts = report->GetPageStarts();
-        recovery->keep();
-        folder.crash(std::move(recovery));
-    }
+    });
     Desk desk;
     desk.answer = MessageAnswer::No;
     Recovery recovery(folder.path());
@@ -118,15 +129,7 @@ TEST(Recovery, PagesComeBack)
 TEST(Recovery, FormatsOfAnEditedRichTextComeBack)
 {
     const CrashFolder folder;
-    {
-        Desk desk;
-        desk.answer = MessageAnswer::No;
-        auto recovery = std::make_unique<Recovery>(folder.path());
-        UReportDoc *report = makeReport(QStringLiteral("R"), QStringLiteral("{\\rtf1 {\\b bold}}"));
-        QTest::keyClick(&dynamic_cast<UReportView *>(report->GetViews().front())->GetEdit(), Qt::Key_X);
-        recovery->keep();
-        folder.crash(std::move(recovery));
-    }
+    crashAfter(folder, [](Desk &, Recovery &) { editedRichText(); });
     Desk desk;
     desk.answer = MessageAnswer::No;
     Recovery recovery(folder.path());
@@ -146,14 +149,10 @@ TEST(Recovery, FormatsGoWithTheViewThatHasThem)
 {
     const CrashFolder folder;
     QString text;
-    {
-        Desk desk;
-        desk.answer = MessageAnswer::No;
-        auto recovery = std::make_unique<Recovery>(folder.path());
-        UReportDoc *report = makeReport(QStringLiteral("R"), QStringLiteral("{\\rtf1 {\\b bold}}"));
+    crashAfter(folder, [&](Desk &desk, Recovery &recovery) {
+        UReportDoc *report = editedRichText();
         auto *formatted = dynamic_cast<UReportView *>(report->GetViews().front());
-        QTest::keyClick(&formatted->GetEdit(), Qt::Key_X);
-        recovery->keep();
+        recovery.keep();
         ASSERT_TRUE(formatted->ShowsFormats());
         desk.frame->OnCommand(kareport::windowNewCommand);
         ASSERT_EQ(report->GetViews().size(), 2U);
@@ -162,9 +161,7 @@ TEST(Recovery, FormatsGoWithTheViewThatHasThem)
         ASSERT_EQ(report->GetViews().size(), 1U);
         ASSERT_FALSE(dynamic_cast<UReportView *>(report->GetViews().front())->ShowsFormats());
         text = report->CopyText();
-        recovery->keep();
-        folder.crash(std::move(recovery));
-    }
+    });
     Desk desk;
     desk.answer = MessageAnswer::No;
     Recovery recovery(folder.path());

@@ -3,6 +3,8 @@
 #include "JobText.h"
 #include "PdfReadBack.h"
 
+#include <QBuffer>
+
 #include <gtest/gtest.h>
 
 #include <algorithm>
