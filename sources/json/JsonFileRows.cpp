@@ -12,6 +12,20 @@ namespace
 
 constexpr std::string_view byteOrderMark = "\xEF\xBB\xBF";
 
+/// The place of a byte, counted on from one whose place is known.
+TextPlace countedTo(std::string_view text, std::size_t from, TextPlace place, std::size_t to)
+{
+    for (; from < to; ++from) {
+        const auto byte = static_cast<unsigned char>(text[from]);
+        if (byte == '\n') {
+            place = {place.line + 1, 1};
+        } else if ((byte & 0xC0U) != 0x80U) {
+            ++place.column;
+        }
+    }
+    return place;
+}
+
 QString wanted()
 {
     return Xlate("a list of objects, or an object a line, was expected");
@@ -21,7 +35,11 @@ QString wanted()
 
 JsonFileRows::JsonFileRows(std::shared_ptr<const FileBytes> file, const std::vector<ColumnChoice> &columns,
                            const Variables &variables)
-    : file_(std::move(file)), text_(file_->view()), keys_(columns, variables)
+    : file_(std::move(file)),
+      text_(file_->view()),
+      keys_(columns, variables),
+      known_{{start(), TextPlace()}},
+      lastPlace_(known_.front())
 {
     wrongChoice_ = keys_.wrongChoice();
     if (wrongChoice_) {
@@ -48,8 +66,6 @@ void JsonFileRows::rewind()
     }
     position_ = start();
     line_ = 1;
-    knownAt_ = position_;
-    knownPlace_ = TextPlace();
     released_ = 0;
     before_ = Before::First;
     row_ = {};
@@ -60,6 +76,7 @@ void JsonFileRows::seek(const RowPlace &place)
 {
     position_ = place.start;
     line_ = place.line;
+    row_ = place;
     before_ = Before::Object;
     error_.reset();
     released_ = text_.size(); // rows in another order come back to what was read
@@ -180,22 +197,56 @@ bool JsonFileRows::fail(std::size_t at, const QString &text)
     return false;
 }
 
-/// The place of a byte. It is counted on from the one that was asked for last: a file of one line may have thousands of keys.
+/// The place of a byte.
 TextPlace JsonFileRows::placeOf(std::size_t at)
 {
-    if (at < knownAt_) {
-        knownAt_ = start();
-        knownPlace_ = TextPlace();
+    lastPlace_ = {at, findPlace(at)};
+    return lastPlace_.place;
+}
+
+TextPlace JsonFileRows::findPlace(std::size_t at)
+{
+    if (lastPlace_.at >= row_.start && lastPlace_.at <= at) {
+        return countedTo(text_, lastPlace_.at, lastPlace_.place, at); // a row may have thousands of keys
     }
-    for (; knownAt_ < at; ++knownAt_) {
-        const auto byte = static_cast<unsigned char>(text_[knownAt_]);
-        if (byte == '\n') {
-            knownPlace_ = {knownPlace_.line + 1, 1};
-        } else if ((byte & 0xC0U) != 0x80U) {
-            ++knownPlace_.column;
-        }
+    if (const auto place = placeInLine(at)) {
+        return *place;
     }
-    return knownPlace_;
+    const auto after = std::upper_bound(known_.begin(), known_.end(), at,
+                                        [](std::size_t byte, const KnownPlace &known) { return byte < known.at; });
+    if (after == known_.end()) {
+        countOn(at);
+        return known_.back().place;
+    }
+    return countedTo(text_, (after - 1)->at, (after - 1)->place, at);
+}
+
+/// The same by the line that the row is in; nothing where that begins far before it, as in a file of one line.
+std::optional<TextPlace> JsonFileRows::placeInLine(std::size_t at) const
+{
+    constexpr std::size_t nearBytes = std::size_t(1) << 16;
+    const std::size_t from = row_.start - std::min(row_.start, nearBytes);
+    const std::string_view before = text_.substr(from, row_.start - from);
+    const std::size_t lineEnd = before.rfind('\n');
+    if (at < row_.start || (lineEnd == std::string_view::npos && from > 0)) {
+        return std::nullopt;
+    }
+    const std::size_t lineStart = lineEnd == std::string_view::npos ? start() : from + lineEnd + 1;
+    return countedTo(text_, lineStart, {row_.line, 1}, at);
+}
+
+/// Counts on from the last place that is known, and keeps places on the way: whatever is asked for in a file of one line, its
+/// bytes are counted once. They are not kept in memory.
+void JsonFileRows::countOn(std::size_t end)
+{
+    constexpr std::size_t piece = std::size_t(1) << 18;
+    std::size_t released = known_.back().at;
+    while (known_.back().at < end) {
+        const KnownPlace last = known_.back();
+        const std::size_t next = std::min(end, last.at + piece);
+        known_.push_back({next, countedTo(text_, last.at, last.place, next)});
+        file_->releaseBefore(next, released);
+    }
 }
 
 } // namespace kareport

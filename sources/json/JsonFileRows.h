@@ -57,6 +57,9 @@ private:
     std::size_t start() const;
     std::size_t startOfKey(std::size_t end) const;
     TextPlace placeOf(std::size_t at);
+    TextPlace findPlace(std::size_t at);
+    std::optional<TextPlace> placeInLine(std::size_t at) const;
+    void countOn(std::size_t end);
 
     bool onKey(std::string_view key, std::size_t end) override;
     bool onNull() override { return true; }
@@ -78,10 +81,16 @@ private:
     bool isList_ = false;
     bool isComplete_ = false; ///< the end of some objects was seen, and so every key
     RowPlace row_;
-    std::size_t knownAt_ = 0; ///< a byte whose place is known
-    TextPlace knownPlace_;
-    std::size_t released_ = 0;  ///< up to where memory was given back
-    std::size_t rowNumber_ = 0; ///< counts every row that is read, also again
+    /// A byte whose place is known.
+    struct KnownPlace
+    {
+        std::size_t at;
+        TextPlace place;
+    };
+    std::vector<KnownPlace> known_; ///< ascending, the start of the text first
+    KnownPlace lastPlace_;          ///< that was asked for last
+    std::size_t released_ = 0;      ///< up to where memory was given back
+    std::size_t rowNumber_ = 0;     ///< counts every row that is read, also again
 
     // Of the row that is read.
     UDataObject *object_ = nullptr;

@@ -2,6 +2,7 @@
 #include "FileBytes.h"
 #include "InputErrorText.h"
 #include "Interrupt.h"
+#include "MappedMemory.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -114,19 +115,6 @@ TEST(FileBytesPosix, APipeIsReadToItsEndHoweverMuchComes)
         const auto view = std::get<std::shared_ptr<const FileBytes>>(opened)->view();
         EXPECT_EQ(view, std::string_view(content.constData(), std::size_t(size)));
     }
-}
-
-/// Megabytes of files that are in this process's memory.
-double mappedMegabytes()
-{
-    QFile status(QStringLiteral("/proc/self/status"));
-    EXPECT_TRUE(status.open(QIODevice::ReadOnly));
-    for (const QByteArray &line : status.readAll().split('\n')) {
-        if (line.startsWith("RssFile:")) {
-            return line.mid(8).trimmed().split(' ').front().toDouble() / 1024;
-        }
-    }
-    return 0;
 }
 
 TEST(FileBytesPosix, WhatIsReleasedLeavesTheMemoryAndCanBeReadAgain)
