@@ -2,7 +2,6 @@
 
 #include "FieldFormatter.h"
 #include "FieldMarker.h"
-#include "NearestName.h"
 #include "TextFolding.h"
 #include "Xlate.h"
 
@@ -41,8 +40,13 @@ QStringList variableNames(const sXmlReportDictionary &dictionary)
     return names;
 }
 
-ColumnComparison::ColumnComparison(const SourceColumns &columns, const sXmlReportDictionary &dictionary)
-    : columns_(columns), dictionary_(dictionary), read_(columns.variables.begin(), columns.variables.end())
+ColumnComparison::ColumnComparison(const SourceColumns &columns, const sXmlReportDictionary &dictionary,
+                                   const QString &data, NameQuestions &questions)
+    : columns_(columns),
+      dictionary_(dictionary),
+      data_(data),
+      questions_(questions),
+      read_(columns.variables.begin(), columns.variables.end())
 {
     for (const sXmlReportVariable &variable : dictionary.Variables) {
         const QString key = foldedKey(variable.VariableName);
@@ -70,16 +74,42 @@ bool ColumnComparison::isUnknown(const SourceColumn &column) const
 QString ColumnComparison::shownInstead(const sXmlReportVariable &variable) const
 {
     const auto [begin, end] = readById_.equal_range(variable.ID);
-    const auto found = std::find_if(begin, end, [&variable](const sXmlReportVariable *other) {
-        return (FieldFormatter::kindsOf(other->Type) & FieldFormatter::kindsOf(variable.Type)) != 0;
+    QString shown;
+    qsizetype last = -1;
+    for (auto other = begin; other != end; ++other) {
+        const bool shows = (FieldFormatter::kindsOf((*other)->Type) & FieldFormatter::kindsOf(variable.Type)) != 0;
+        const qsizetype column = columns_.variables.lastIndexOf(foldedKey((*other)->VariableName));
+        if (shows && column > last) { // the column that is read last takes the place of the others
+            shown = (*other)->VariableName;
+            last = column;
+        }
+    }
+    return shown;
+}
+
+/// Asks which variable of the dictionary was meant.
+QString ColumnComparison::variableQuestion(const QString &name) const
+{
+    return questions_.ask(dictionary_.DictionaryName, name, [this] { return variableNames(dictionary_); });
+}
+
+/// Asks which column was meant of those that are no variables.
+QString ColumnComparison::columnQuestion(const QString &name) const
+{
+    return questions_.ask(dictionary_.DictionaryName + QChar() + data_, name, [this] {
+        QStringList unknown;
+        for (const SourceColumn &column : columns_.columns) {
+            if (isUnknown(column) && unknown.size() < mostNames) {
+                unknown.append(column.name);
+            }
+        }
+        return unknown;
     });
-    return found != end ? (*found)->VariableName : QString();
 }
 
 std::vector<JobNote> ColumnComparison::unknownColumns() const
 {
     std::vector<JobNote> notes;
-    const QStringList names = variableNames(dictionary_);
     std::size_t more = 0;
     for (const SourceColumn &column : columns_.columns) {
         if (!isUnknown(column)) {
@@ -91,12 +121,14 @@ std::vector<JobNote> ColumnComparison::unknownColumns() const
         }
         const QString sentence = Xlate("the column \"%1\" is not a variable of the dictionary \"%2\"")
                                      .arg(column.name, dictionary_.DictionaryName);
-        notes.push_back({JobNote::Kind::UnknownColumn,
-                         InputError{columns_.source, column.place, withQuestion(sentence, column.name, names)}});
+        notes.push_back(
+            {JobNote::Kind::UnknownColumn,
+             InputError{columns_.source, column.place, joinedQuestion(sentence, variableQuestion(column.name))}});
     }
     if (more > 0) {
-        const QString text = Xlate("%1 more columns are not variables of the dictionary \"%2\"")
-                                 .arg(QString::number(more), dictionary_.DictionaryName);
+        const QString sentence = more == 1 ? Xlate("%1 more column is not a variable of the dictionary \"%2\"")
+                                           : Xlate("%1 more columns are not variables of the dictionary \"%2\"");
+        const QString text = sentence.arg(QString::number(more), dictionary_.DictionaryName);
         notes.push_back({JobNote::Kind::UnknownColumn, InputError{columns_.source, std::nullopt, text}});
     }
     return notes;
@@ -117,16 +149,7 @@ QStringList ColumnComparison::assumedUnits(const DataUnits &units) const
 std::vector<UnfilledField> ColumnComparison::unfilledFields(const sXmlReportFields &fields) const
 {
     std::vector<UnfilledField> unfilled;
-    const QStringList names = variableNames(dictionary_);
-    QStringList unknown; // columns that may have been meant
-    for (const SourceColumn &column : columns_.columns) {
-        if (isUnknown(column) && unknown.size() < mostNames) {
-            unknown.append(column.name);
-        }
-    }
-    const auto questionOf = [&unfilled](const QString &name, const QStringList &known) {
-        return unfilled.size() < mostQuestions ? didYouMean(name, known) : QString();
-    };
+    const auto isAsked = [&unfilled] { return unfilled.size() < mostQuestions; };
     QSet<QString> seen;
     for (const sXmlReportField &field : fields) {
         const QString key = foldedKey(field.VariableName);
@@ -138,10 +161,11 @@ std::vector<UnfilledField> ColumnComparison::unfilledFields(const sXmlReportFiel
         seen.insert(key);
         const sXmlReportVariable *variable = variables_.value(key);
         if (variable == nullptr) {
-            unfilled.push_back({field.VariableName, questionOf(field.VariableName, names), false, {}});
+            const QString question = isAsked() ? variableQuestion(field.VariableName) : QString();
+            unfilled.push_back({field.VariableName, question, false, {}});
         } else if (!read_.contains(key)) { // not the identifier counts: another variable may have the same one
-            unfilled.push_back(
-                {field.VariableName, questionOf(field.VariableName, unknown), true, shownInstead(*variable)});
+            const QString question = isAsked() ? columnQuestion(field.VariableName) : QString();
+            unfilled.push_back({field.VariableName, question, true, shownInstead(*variable)});
         }
     }
     return unfilled;

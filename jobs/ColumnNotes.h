@@ -2,6 +2,7 @@
 
 #include "DataRemarks.h"
 #include "JobNotes.h"
+#include "NameQuestions.h"
 #include "RowList.h"
 #include "sXmlReportDictionary.h"
 #include "sXmlReportField.h"
@@ -35,7 +36,7 @@ struct UnfilledField
     QString question; ///< which column or variable may have been meant, as a question; empty for none
     bool isVariable;  ///< of the dictionary
     QString shown;    ///< the variable that a column fills and that has the same identifier, so that its value is shown
-                      ///< instead; empty for none
+                      ///< instead; of several, that of the last column; empty for none
 };
 
 /// The names of the variables of a dictionary, in its order.
@@ -45,7 +46,10 @@ QStringList variableNames(const sXmlReportDictionary &dictionary);
 class ColumnComparison
 {
 public:
-    ColumnComparison(const SourceColumns &columns, const sXmlReportDictionary &dictionary);
+    /// @param data       the name of the data set
+    /// @param questions  of all steps of a job; must live longer
+    ColumnComparison(const SourceColumns &columns, const sXmlReportDictionary &dictionary, const QString &data,
+                     NameQuestions &questions);
 
     /// Whether a variable is read from a column.
     bool isRead(const QString &variable) const;
@@ -62,9 +66,13 @@ public:
 private:
     bool isUnknown(const SourceColumn &column) const;
     QString shownInstead(const sXmlReportVariable &variable) const;
+    QString variableQuestion(const QString &name) const;
+    QString columnQuestion(const QString &name) const;
 
     const SourceColumns &columns_;
     const sXmlReportDictionary &dictionary_;
+    QString data_;
+    NameQuestions &questions_;
     QSet<QString> read_;                                      ///< the folded names of the variables that are read
     QHash<QString, const sXmlReportVariable *> variables_;    ///< by their folded names; of several the last one
     QMultiHash<qint32, const sXmlReportVariable *> readById_; ///< those that are read
