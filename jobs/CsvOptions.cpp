@@ -129,6 +129,7 @@ CsvDialect readCsvDialect(const JsonNode &set)
 {
     CsvDialect dialect;
     readDelimiter(set[QStringLiteral("delimiter")], dialect);
+    dialect.isHeaderSaid = set[QStringLiteral("header")].exists();
     dialect.hasHeader = set[QStringLiteral("header")].boolean(true);
     readColumns(set[QStringLiteral("columns")], dialect);
     if (const JsonNode order = set[QStringLiteral("order")]; order.exists()) {

@@ -1,6 +1,6 @@
 #include "JobSteps.h"
 
-#include "NearestName.h"
+#include "NameQuestions.h"
 #include "TemplateSource.h"
 #include "TextFolding.h"
 #include "UXmlReportTpl.h"
@@ -15,11 +15,6 @@ namespace kareport
 
 namespace
 {
-
-QString joined(const QString &sentence, const QString &question)
-{
-    return question.isEmpty() ? sentence : sentence + QStringLiteral(": ") + question;
-}
 
 /// The first of two errors.
 std::optional<InputError> firstOf(std::optional<InputError> first, std::optional<InputError> second)
@@ -112,8 +107,11 @@ InputError JobSteps::inTemplate(TemplatePart part, const QString &variable, cons
 /// Notes what of the data and of a table or block does not match.
 JobSteps::Wrong JobSteps::noteColumns(const SourceColumns &columns, const QString &data, const WrittenRecord &record)
 {
-    const ColumnComparison compared(columns, *report_.GetTemplate()->GetDictionary(record.use));
-    auto wrong = notes_.add(compared.unknownColumns());
+    const ColumnComparison compared(columns, *report_.GetTemplate()->GetDictionary(record.use), data, questions_);
+    const QString pair = record.use + QChar() + data;
+    const bool isNew = !comparedData_.contains(pair); // the notes of another step on them are there already
+    comparedData_.insert(pair);
+    auto wrong = isNew ? notes_.add(compared.unknownColumns()) : std::nullopt;
     for (const UnfilledField &field : compared.unfilledFields(record.fields)) {
         wrong = firstOf(wrong, noteField(field, record));
     }
@@ -145,15 +143,15 @@ JobSteps::Wrong JobSteps::noteField(const UnfilledField &field, const WrittenRec
     if (!field.isVariable) {
         const QString sentence = Xlate("the field \"%1\" of the %2 \"%3\" is not a variable of the dictionary \"%4\"")
                                      .arg(field.variable, record.what, record.name, record.use);
-        return notes_.add(
-            {{Kind::UnfilledField, inTemplate(record.part, field.variable, record, joined(sentence, field.question))}});
+        return notes_.add({{Kind::UnfilledField, inTemplate(record.part, field.variable, record,
+                                                            joinedQuestion(sentence, field.question))}});
     }
     const QString sentence =
         Xlate("no column fills the field \"%1\" of the %2 \"%3\"").arg(field.variable, record.what, record.name);
     const QString reason = field.shown.isEmpty() ? sentence
                                                  : sentence + QStringLiteral("; ") +
                                                        Xlate("\"%1\" has the same ID and shows there").arg(field.shown);
-    return notes_.add({{Kind::UnfilledField, source_.errorAt(record.path, joined(reason, field.question))}});
+    return notes_.add({{Kind::UnfilledField, source_.errorAt(record.path, joinedQuestion(reason, field.question))}});
 }
 
 /// Notes sort keys that the dictionary does not have: the key before such a one counts in its place.
@@ -177,7 +175,8 @@ JobSteps::Wrong JobSteps::noteSortKeys(const WrittenRecord &record)
         const QString sentence =
             Xlate("the sort key \"%1\" of the table \"%2\" is not a variable of the dictionary \"%3\"")
                 .arg(key.VariableName, record.name, record.use);
-        const QString text = withQuestion(sentence, key.VariableName, names);
+        const QString question = questions_.ask(record.use, key.VariableName, [&names] { return names; });
+        const QString text = joinedQuestion(sentence, question);
         wrong = firstOf(wrong, notes_.add({{JobNote::Kind::UnknownSortKey,
                                             inTemplate(TemplatePart::SortKey, key.VariableName, record, text)}}));
     }
@@ -257,10 +256,13 @@ JobSteps::Wrong JobSteps::noteLeftOut(ShownRows &rows, const WrittenRecord &reco
 /// Notes what a source says of itself.
 JobSteps::Wrong JobSteps::noteSource(const RowList &rows)
 {
+    using Kind = JobNote::Kind;
     Wrong wrong;
     for (const InputError &note : rows.notes()) {
-        using Kind = JobNote::Kind;
         wrong = firstOf(wrong, notes_.add({{note.place ? Kind::Difference : Kind::PassedOver, note}}));
+    }
+    for (const InputError &note : rows.differences()) {
+        wrong = firstOf(wrong, notes_.add({{Kind::Difference, note}}));
     }
     return wrong;
 }

@@ -5,6 +5,7 @@
 #include "Job.h"
 #include "JobData.h"
 #include "JsonSource.h"
+#include "NameQuestions.h"
 #include "Placeholders.h"
 #include "ResultOutputs.h"
 #include "ShownRows.h"
@@ -74,7 +75,9 @@ private:
     Wrong noSuchRecord(const QString &what, const QString &name, const QStringList &names, const JsonPath &path) const;
     template <typename Record>
     Wrong wrongRecord(const Record &record, const QString &what, const QString &name, const JsonPath &path) const;
-    Expected<std::unique_ptr<RowList>> openRows(const QString &data, const QString &dictionary, bool firstOnly);
+    /// @param shown  the fields that show what is read; null where more is made of it
+    Expected<std::unique_ptr<RowList>> openRows(const QString &data, const QString &dictionary, bool firstOnly,
+                                                const sXmlReportFields *shown);
     Wrong noteColumns(const SourceColumns &columns, const QString &data, const WrittenRecord &record);
     void noteUnits(const ColumnComparison &compared, const QString &data);
     Wrong noteField(const UnfilledField &field, const WrittenRecord &record);
@@ -104,8 +107,10 @@ private:
     std::unique_ptr<VariablePlaces>
         places_; ///< of the template; null until one is asked for, and where it cannot be read
     bool arePlacesRead_ = false;
-    QSet<QString> notedUnits_; ///< data sets and keys of units
-    DataUnits units_;          ///< of the data that was opened last
+    NameQuestions questions_;
+    QSet<QString> comparedData_; ///< dictionaries and data sets whose columns were compared with them
+    QSet<QString> notedUnits_;   ///< data sets and keys of units
+    DataUnits units_;            ///< of the data that was opened last
 };
 
 } // namespace kareport

@@ -41,6 +41,7 @@ public:
     /// Nothing for what is computed, nor where rows are left out: which row of the source it is, is not kept.
     ValuePlace placeOf(std::size_t index, const QString &variable) override;
     std::vector<InputError> notes() const override { return rows_->notes(); }
+    std::vector<InputError> differences() const override { return rows_->differences(); }
 
     const TableGroups &groups() const override { return shape_.groups; }
     std::size_t firstNewLevel() const override { return firstNewLevel_; }

@@ -163,9 +163,8 @@ QStringList ColumnBinding::variables() const
 
 void ColumnBinding::storeNone(const BoundField &field, UDictionary &object) const
 {
-    const unsigned id = field.parser.id();
-    if (std::find(sharedIds_.begin(), sharedIds_.end(), id) == sharedIds_.end()) {
-        object.Remove(id);
+    if (!isShared(field)) {
+        object.Remove(field.parser.id());
     }
 }
 

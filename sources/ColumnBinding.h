@@ -7,6 +7,7 @@
 #include <QString>
 #include <QStringList>
 
+#include <algorithm>
 #include <cstddef>
 #include <optional>
 #include <variant>
@@ -20,6 +21,7 @@ struct Variables
 {
     FindVariable find;
     QStringList names;
+    std::optional<QStringList> shown = std::nullopt; ///< those that a report shows; nothing where that is not known
 };
 
 /// Says which column a variable is read from: one by its name, without regard to case, or by its number from 1.
@@ -80,6 +82,12 @@ public:
         for (const unsigned id : sharedIds_) {
             object.Remove(id);
         }
+    }
+    /// Whether another field has the identifier as well.
+    bool isShared(const BoundField &field) const
+    {
+        return !sharedIds_.empty() &&
+               std::find(sharedIds_.begin(), sharedIds_.end(), field.parser.id()) != sharedIds_.end();
     }
     /// Says that a row has no value for a field. What another field has stored under the identifier stays.
     void storeNone(const BoundField &field, UDictionary &object) const;

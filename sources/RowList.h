@@ -54,6 +54,9 @@ public:
     /// What there is to say of a source whose rows are sound. One with a place tells what does not fit together in the
     /// source, one without what the source holds that no list reads. Nothing before the list has come to its end.
     virtual std::vector<InputError> notes() const { return {}; }
+    /// What does not fit together in the rows of a source, whether it has places or not. Nothing before the list has come to its
+    /// end.
+    virtual std::vector<InputError> differences() const { return {}; }
 };
 
 } // namespace kareport

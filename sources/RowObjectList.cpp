@@ -91,6 +91,13 @@ ValuePlace RowObjectList::placeOf(std::size_t index, const QString &variable)
     return found;
 }
 
+std::vector<InputError> RowObjectList::differences() const
+{
+    // Until then another thread adds to them.
+    const bool isComplete = batch_ != nullptr && batch_->isLast;
+    return isComplete ? reader_->notes() : std::vector<InputError>();
+}
+
 /// Goes back to the first row, with no batch read.
 void RowObjectList::restart()
 {

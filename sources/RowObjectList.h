@@ -30,6 +30,7 @@ public:
     std::optional<InputError> error() const override { return error_; }
     std::optional<SourceColumns> columns() const override;
     ValuePlace placeOf(std::size_t index, const QString &variable) override;
+    std::vector<InputError> differences() const override;
     /// The source, for what it tells about its columns.
     const RowReader &reader() const { return *reader_; }
 

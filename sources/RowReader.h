@@ -5,6 +5,7 @@
 #include "UDataObject.h"
 
 #include <cstddef>
+#include <memory>
 #include <optional>
 #include <vector>
 
@@ -68,12 +69,46 @@ public:
     virtual QString name() const = 0;
     /// What is wrong with the columns that were chosen, where the data itself is not.
     const std::optional<ColumnFault> &wrongChoice() const { return wrongChoice_; }
+    /// What does not fit together in rows that are sound, as far as they were read.
+    const std::vector<InputError> &notes() const { return notes_; }
 
 protected:
+    /// The place of a value in a source that has none.
+    static std::optional<TextPlace> noPlace() { return std::nullopt; }
+    /// Stores the value of a field, and notes once where it takes the place of another one of the row under the same identifier.
+    /// @param isShared  another field has the identifier as well
+    /// @param store     stores it. @return whether it fits
+    /// @param place     says where the value stands; nothing where that has no place
+    template <typename Store, typename Place>
+    bool storeOver(bool isShared, unsigned id, const QString &column, UDataObject &object, const Store &store,
+                   const Place &place)
+    {
+        if (!isShared) {
+            return store();
+        }
+        const UDictEntry *held = object.Find(id);
+        const auto before = held != nullptr ? std::make_unique<UDictEntry>(*held) : nullptr;
+        if (!store()) {
+            return false;
+        }
+        if (before && isOther(*before, object.Find(id)) && isFirstOver(id)) {
+            notes_.push_back({name(), place(), overText(column)});
+        }
+        return true;
+    }
+
     std::vector<SourceColumn> columns_;
     ColumnBinding binding_;
     std::optional<ColumnFault> wrongChoice_;
     std::optional<InputError> error_;
+    std::vector<InputError> notes_;
+
+private:
+    static bool isOther(const UDictEntry &before, const UDictEntry *now);
+    static QString overText(const QString &column);
+    bool isFirstOver(unsigned id);
+
+    std::vector<unsigned> notedIds_;
 };
 
 } // namespace kareport

@@ -25,12 +25,13 @@ enum class DelimiterKind
 struct CsvDialect
 {
     DelimiterKind kind = DelimiterKind::Character;
-    char delimiter = ',';  ///< one ASCII character, for `DelimiterKind::Character`
-    bool hasHeader = true; ///< the first row names the columns
-    QStringList names;     ///< of the columns by their position, empty for one that is skipped. Then names of a
-                           ///< header row do not count, and every row has as many cells
-    QString order;         ///< the columns in short form, such as "PNEZD"; empty for none. Names of a header
-                           ///< row then do not count, nor do they with `names`, which win
+    char delimiter = ',';      ///< one ASCII character, for `DelimiterKind::Character`
+    bool hasHeader = true;     ///< the first row names the columns
+    bool isHeaderSaid = false; ///< somebody who knows the file has said so: the row is not looked at for data
+    QStringList names;         ///< of the columns by their position, empty for one that is skipped. Then names of a
+                               ///< header row do not count, and every row has as many cells
+    QString order;             ///< the columns in short form, such as "PNEZD"; empty for none. Names of a header
+                               ///< row then do not count, nor do they with `names`, which win
     std::vector<ColumnChoice> columns; ///< what is read from which column; it wins over names and order
     TextEncoding encoding = TextEncoding::Utf8;
     NumberStyle numbers;

@@ -33,15 +33,19 @@ bool CsvReader::isPassedOver() const
     return layout_.passesBlankLines && (text == std::string_view::npos || bytes_[text] == '\n');
 }
 
-/// Passes over a line, whatever it holds. Where lines end with a carriage return alone, it would be all that follows: that is
-/// an error as in a row. @return false then
+/// Passes over a line, whatever it holds, with its carriage returns before the line feed: some files have several. Where lines
+/// end with a carriage return alone, it would be all that follows: that is an error as in a row. @return false then
 bool CsvReader::passOverLine()
 {
     const std::size_t end = bytes_.find('\n', position_);
     const std::string_view line =
         bytes_.substr(position_, end - position_); // to the end where there is no such character
     const std::size_t carriageReturn = line.find('\r');
-    if (carriageReturn != std::string_view::npos && carriageReturn + 1 < line.size()) {
+    const std::size_t lastOfText = line.find_last_not_of('\r');
+    const bool isAtEnd = end == std::string_view::npos && carriageReturn + 1 < line.size();
+    if (carriageReturn != std::string_view::npos &&
+        (isAtEnd || (lastOfText != std::string_view::npos && carriageReturn < lastOfText)))
+    {
         rowStart_ = position_;
         rowLine_ = line_;
         return failBareReturn(position_ + carriageReturn);

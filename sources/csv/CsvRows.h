@@ -32,7 +32,7 @@ public:
 private:
     bool readColumns(const CsvDialect &dialect);
     bool bindColumns(const CsvDialect &dialect, const Variables &variables);
-    bool holdsValues(const CsvDialect &dialect) const;
+    void lookAtHeader(const CsvDialect &dialect);
     void failWithoutVariable();
     bool failWithCells();
     bool failInCell(const BoundField &field);

@@ -64,7 +64,10 @@ bool JsonFileRows::isWanted(unsigned id) const
 bool JsonFileRows::storeAll(const std::function<bool(const ValueParser &)> &store)
 {
     for (const JsonKeys::Field &field : *fields_) {
-        if (isWanted(field.parser.id()) && !store(field.parser)) {
+        const unsigned id = field.parser.id();
+        const auto storeField = [&] { return store(field.parser); };
+        const auto place = [this] { return std::optional(placeOf(startOfValue())); };
+        if (isWanted(id) && !storeOver(keys_.hasSharedIds(), id, field.name, *object_, storeField, place)) {
             return failInValue(field);
         }
     }

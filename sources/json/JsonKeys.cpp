@@ -79,13 +79,16 @@ JsonKeys::Key JsonKeys::bind(const QString &name)
 void JsonKeys::addField(Key &key, const QString &name, const QString &variable, const ValueParser &parser)
 {
     qsizetype index = names_.indexOf(foldedKey(variable));
-    if (index < 0) {
+    const bool isNew = index < 0;
+    if (isNew) {
         index = names_.size();
         names_.append(foldedKey(variable));
         lastRows_.push_back(0);
     }
     if (std::find(ids_.begin(), ids_.end(), parser.id()) == ids_.end()) {
         ids_.push_back(parser.id());
+    } else {
+        hasSharedIds_ = hasSharedIds_ || isNew; // a variable may have several spellings of its key
     }
     key.fields.push_back({name, parser, static_cast<std::size_t>(index)});
 }

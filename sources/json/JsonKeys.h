@@ -52,6 +52,8 @@ public:
 
     /// The identifiers of the variables that are read, each once.
     const std::vector<unsigned> &ids() const { return ids_; }
+    /// Whether several variables have one identifier.
+    bool hasSharedIds() const { return hasSharedIds_; }
     /// The names of these variables, folded.
     const QStringList &variables() const { return names_; }
 
@@ -73,6 +75,7 @@ private:
     std::unordered_map<std::string, Key> keys_;
     Key unkept_; ///< the last key that is not kept
     std::vector<unsigned> ids_;
+    bool hasSharedIds_ = false;
     QStringList names_;                 ///< of the variables that are read, folded
     std::vector<std::size_t> lastRows_; ///< that had them
 };

@@ -99,7 +99,7 @@ void PostgresRows::readSystems()
     // PostGIS may be in a schema that names are not looked up in, and another table may have the name there: that of the type of
     // geometries comes first.
     const PostgresResult table = connection_->read(
-        "SELECT c.oid::pg_catalog.regclass FROM pg_catalog.pg_class c WHERE c.relname = 'spatial_ref_sys' "
+        "SELECT c.oid::pg_catalog.regclass, pg_catalog.has_table_privilege(c.oid, 'SELECT') FROM pg_catalog.pg_class c WHERE c.relname = 'spatial_ref_sys' "
         "AND c.relkind IN ('r', 'v', 'm', 'p', 'f') AND pg_catalog.has_schema_privilege(c.relnamespace, 'USAGE') "
         "ORDER BY c.relnamespace IN (SELECT t.typnamespace FROM pg_catalog.pg_type t WHERE t.typname = 'geometry') DESC, "
         "pg_catalog.pg_table_is_visible(c.oid) DESC, c.oid LIMIT 1");
@@ -107,7 +107,8 @@ void PostgresRows::readSystems()
         failUnlessStopped();
         return;
     }
-    if (pq_.ntuples(table.get()) == 0) {
+    // One that this user must not read tells him nothing, as if it were not there.
+    if (pq_.ntuples(table.get()) == 0 || QByteArray(pq_.getvalue(table.get(), 0, 1)) != "t") {
         return;
     }
     const QByteArray name = pq_.getvalue(table.get(), 0, 0); // as SQL has it, with quotes where they are needed

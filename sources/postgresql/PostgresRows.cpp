@@ -105,20 +105,24 @@ bool PostgresRows::storeRow(const PGresult *row, UDataObject &object)
     const auto &fields = binding_.fields();
     for (std::size_t i = 0; i < fields.size(); ++i) {
         const FieldSource &source = sources_[i];
-        if (!source.part) {
-            if (!storeCell(fields[i], row, source.column, object)) {
-                return false;
-            }
-            continue;
-        }
-        const auto system = point_ ? systems_.constFind(point_->referenceSystem) : systems_.constEnd();
-        const auto wrong = storeGeometryPart(binding_, fields[i], *source.part, point_,
-                                             system != systems_.constEnd() ? &*system : nullptr, object);
-        if (wrong) {
-            return failInRow(*wrong);
+        const auto store = [&] {
+            return source.part ? storePart(fields[i], *source.part, object)
+                               : storeCell(fields[i], row, source.column, object);
+        };
+        if (!storeOver(binding_.isShared(fields[i]), fields[i].parser.id(), fields[i].variable, object, store, noPlace))
+        {
+            return false;
         }
     }
     return true;
+}
+
+bool PostgresRows::storePart(const BoundField &field, GeometryPart part, UDataObject &object)
+{
+    const auto system = point_ ? systems_.constFind(point_->referenceSystem) : systems_.constEnd();
+    const auto wrong =
+        storeGeometryPart(binding_, field, part, point_, system != systems_.constEnd() ? &*system : nullptr, object);
+    return !wrong || failInRow(*wrong);
 }
 
 bool PostgresRows::storeCell(const BoundField &field, const PGresult *row, int column, UDataObject &object)

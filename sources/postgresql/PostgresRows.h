@@ -43,6 +43,7 @@ private:
     void readSystems();
     bool storeRow(const PGresult *row, UDataObject &object);
     bool storeCell(const BoundField &field, const PGresult *row, int column, UDataObject &object);
+    bool storePart(const BoundField &field, GeometryPart part, UDataObject &object);
     bool readGeometry(const PGresult *row);
     bool fail(const QString &text);
     bool failUnlessStopped();

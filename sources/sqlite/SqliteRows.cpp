@@ -51,7 +51,12 @@ bool SqliteRows::next(UDataObject &object, const std::vector<unsigned> * /*onlyI
     const auto &fields = binding_.fields();
     for (std::size_t i = 0; i < fields.size(); ++i) {
         const FieldSource &source = sources_[i];
-        if (source.part ? !storePart(fields[i], *source.part, object) : !storeCell(fields[i], source.column, object)) {
+        const auto store = [&] {
+            return source.part ? storePart(fields[i], *source.part, object)
+                               : storeCell(fields[i], source.column, object);
+        };
+        if (!storeOver(binding_.isShared(fields[i]), fields[i].parser.id(), fields[i].variable, object, store, noPlace))
+        {
             return false;
         }
     }

@@ -292,6 +292,20 @@ TEST_F(PostgresServer, AReferenceSystemThatCannotBeReadIsSaid)
     server().runSql("DROP TABLE spatial_ref_sys");
 }
 
+TEST_F(PostgresServer, AReferenceSystemThatTheUserMustNotReadIsNone)
+{
+    server().runSql("CREATE TABLE spatial_ref_sys (srid int, auth_name text, auth_srid int, srtext text);"
+                    "INSERT INTO spatial_ref_sys VALUES (1, 'EPSG', 31467, ''); CREATE ROLE limited");
+    PostgresQuery limited =
+        query("SELECT '1' AS number, decode('010100002001000000000000000000F03F0000000000000040', 'hex') AS g", {},
+              {{"Description", QStringLiteral("@srs")}});
+    limited.connection += QStringLiteral(" options='-c role=limited'");
+    EXPECT_EQ(rowsOf(limited), "number=1") << "as in a database without PostGIS";
+    server().runSql("GRANT SELECT ON spatial_ref_sys TO limited");
+    EXPECT_EQ(rowsOf(limited), "number=1 description=EPSG:31467");
+    server().runSql("DROP TABLE spatial_ref_sys; DROP ROLE limited");
+}
+
 TEST_F(PostgresServer, AQueryThatRunsLongCanBeStopped)
 {
     constexpr int mostCalls = 40; // more than it takes to connect
