@@ -11,6 +11,12 @@ constexpr double halfCircle = std::numbers::pi;
 // Points of a half circle whose last digits are rounded may be a little more than the diameter from each other.
 constexpr double rounding = 1e-6;
 
+/// Whether a circle of a radius has a chord.
+bool reaches(double radius, double chord, double tolerance)
+{
+    return radius > 0 && chord <= 2 * radius * (1 + rounding) + tolerance;
+}
+
 FittedCurve arcOfTurn(PlanePoint centre, PlanePoint start, double turn, bool isRight)
 {
     const double radius = distanceBetween(centre, start);
@@ -43,23 +49,29 @@ FittedCurve arcAbout(PlanePoint centre, PlanePoint start, double length, bool is
     return arcOfTurn(centre, start, length / distanceBetween(centre, start), isRight);
 }
 
-FittedCurve arcOver(PlanePoint start, PlanePoint end, double radius, bool isRight, bool isLong)
+FittedCurve arcOver(PlanePoint start, PlanePoint end, double radius, bool isRight, bool isLong, double tolerance)
 {
     const double chord = distanceBetween(start, end);
-    if (!(radius > 0) || !std::isfinite(radius) || chord > 2 * radius * (1 + rounding)) {
+    if (!std::isfinite(radius) || !reaches(radius, chord, tolerance)) {
         return CurveFault::NotFinite;
     }
     const double shortTurn = 2 * std::asin(std::min(1.0, chord / 2 / radius));
-    const double turn = isLong ? 2 * halfCircle - shortTurn : shortTurn;
-    const double side = isRight ? 1 : -1;
-    return PlaneCurve::make(TransitionForm::Clothoid, start, bearingBetween(start, end) - side * turn / 2,
-                            chord > 0 ? radius * turn : 0, side / radius, side / radius);
+    return chord > 0 ? arcTowards(start, end, radius, isRight, isLong ? 2 * halfCircle - shortTurn : shortTurn)
+                     : CurveFault::NoLength;
 }
 
-std::optional<PlanePoint> centreOfArc(PlanePoint start, PlanePoint end, double radius, bool isRight, bool isLong)
+FittedCurve arcTowards(PlanePoint start, PlanePoint end, double radius, bool isRight, double turn)
+{
+    const double side = isRight ? 1 : -1;
+    return PlaneCurve::make(TransitionForm::Clothoid, start, bearingBetween(start, end) - side * turn / 2,
+                            radius * turn, side / radius, side / radius);
+}
+
+std::optional<PlanePoint> centreOfArc(PlanePoint start, PlanePoint end, double radius, bool isRight, bool isLong,
+                                      double tolerance)
 {
     const double chord = distanceBetween(start, end);
-    if (!(chord > 0) || !(radius > 0) || chord > 2 * radius * (1 + rounding)) {
+    if (!(chord > 0) || !reaches(radius, chord, tolerance)) {
         return std::nullopt;
     }
     const double height = std::sqrt(std::max(0.0, (radius - chord / 2) * (radius + chord / 2)));

@@ -88,7 +88,7 @@ JobSteps::Wrong JobSteps::write(const Job::Block &step, const JsonPath &path)
     if (auto wrong = wrongRecord(*block, Xlate("block"), step.name, path)) {
         return wrong;
     }
-    const auto opened = openRows(step.data, block->Use, true);
+    const auto opened = openRows(step.data, block->Use, true, &block->Fields);
     if (const InputError *error = errorOf(opened)) {
         return *error;
     }
@@ -133,7 +133,7 @@ JobSteps::Wrong JobSteps::write(const Job::Table &step, const JsonPath &path)
     if (auto wrong = wrongRecord(*table, Xlate("table"), step.name, path)) {
         return wrong;
     }
-    auto opened = openRows(step.data, table->Use, false);
+    auto opened = openRows(step.data, table->Use, false, step.shape.isEmpty() ? &table->Fields : nullptr);
     if (const InputError *error = errorOf(opened)) {
         return *error;
     }
@@ -267,10 +267,11 @@ JobSteps::Wrong JobSteps::wrongRecord(const Record &record, const QString &what,
 }
 
 /// The rows of a data set, typed by a dictionary of the template.
-Expected<std::unique_ptr<RowList>> JobSteps::openRows(const QString &data, const QString &dictionary, bool firstOnly)
+Expected<std::unique_ptr<RowList>> JobSteps::openRows(const QString &data, const QString &dictionary, bool firstOnly,
+                                                      const sXmlReportFields *shown)
 {
     const UXmlReportTpl *tpl = report_.GetTemplate();
-    const JobData::VariablesIn variablesIn = [this, tpl, dictionary](const DataUnits &units) {
+    const JobData::VariablesIn variablesIn = [this, tpl, dictionary, shown](const DataUnits &units) {
         units_ = units;
         Variables variables;
         variables.find = [tpl, units, dictionary](const QString &variable) -> std::optional<ValueParser> {
@@ -282,6 +283,12 @@ Expected<std::unique_ptr<RowList>> JobSteps::openRows(const QString &data, const
             return ValueParser(type, static_cast<unsigned>(id), units);
         };
         variables.names = variableNames(*tpl->GetDictionary(dictionary));
+        if (shown != nullptr) {
+            variables.shown.emplace();
+            for (const sXmlReportField &field : *shown) {
+                variables.shown->append(field.VariableName);
+            }
+        }
         return variables;
     };
     return data_.open(data, variablesIn, firstOnly);

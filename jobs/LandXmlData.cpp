@@ -28,8 +28,11 @@ private:
     {
         LandXmlQuery query = query_;
         query.unit = isInFileUnits_ ? std::nullopt : std::optional(request.units.factorOf(VARIABLE_LENGTH));
-        auto rows = std::make_unique<LandXmlList>(
-            bytes, std::move(query), request.variablesIn(LandXmlList::units()).find, progress, request.settings);
+        const Variables variables = request.variablesIn(LandXmlList::units());
+        auto rows = std::make_unique<LandXmlList>(bytes, std::move(query), variables.find, progress, request.settings);
+        if (variables.shown) {
+            rows->setShown(*variables.shown);
+        }
         if (auto error = rows->error()) {
             return *std::move(error);
         }

@@ -1016,6 +1016,11 @@
         <translation>der Arbeitsspeicher reicht für die Daten nicht aus</translation>
     </message>
     <message>
+        <location filename="../sources/RowReader.cpp"/>
+        <source>a row has values in several columns whose variables have one ID: that of "%1", the last one, shows</source>
+        <translation>eine Zeile hat Werte in mehreren Spalten, deren Variablen eine ID haben: der von "%1", der letzten, erscheint</translation>
+    </message>
+    <message>
         <location filename="../sources/SpooledBytes.cpp"/>
         <source>the data cannot be kept in a temporary file: %1</source>
         <translation>die Daten können nicht in einer temporären Datei gehalten werden: %1</translation>
@@ -1127,36 +1132,6 @@
     </message>
     <message>
         <location filename="../sources/csv/CsvRows.cpp"/>
-        <source>the header row holds values that fit the columns, and would be lost if it is data: "header": false (--no-header) was expected, with "skip" for lines that are not data</source>
-        <translation>die Kopfzeile enthält Werte, die zu den Spalten passen, und ginge verloren, wenn sie Daten ist: "header": false (--no-header) wurde erwartet, mit "skip" für Zeilen, die keine Daten sind</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvRows.cpp"/>
-        <source>"%1" is not an order of columns: each of the letters P, N, E, Z and D at most once, and - for a column that is skipped, was expected, such as PNEZD</source>
-        <translation>"%1" ist keine Reihenfolge von Spalten: erwartet wurden die Buchstaben P, N, E, Z und D je höchstens einmal, und - für eine Spalte, die übergangen wird, wie PNEZD</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvRows.cpp"/>
-        <source>a header row of variable names was expected</source>
-        <translation>eine Kopfzeile mit Variablennamen wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvRows.cpp"/>
-        <source>a header row was expected</source>
-        <translation>eine Kopfzeile wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvRows.cpp"/>
-        <source>no column of the header row is a variable of the dictionary: a header row of variable names, with the data's delimiter between them, was expected</source>
-        <translation>keine Spalte der Kopfzeile ist eine Variable des Wörterbuchs: eine Kopfzeile mit Variablennamen, dazwischen das Trennzeichen der Daten, wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvRows.cpp"/>
-        <source>no column is a variable of the dictionary: without a header row, columns with their numbers were expected, or an order such as PNEZD</source>
-        <translation>keine Spalte ist eine Variable des Wörterbuchs: ohne Kopfzeile wurden Spalten mit ihren Nummern erwartet oder eine Reihenfolge wie PNEZD</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvRows.cpp"/>
         <source>the row has %1 cells: %2 were expected, as in the header row</source>
         <translation>die Zeile hat %1 Zellen: wie in der Kopfzeile wurden %2 erwartet</translation>
     </message>
@@ -1169,6 +1144,46 @@
         <location filename="../sources/csv/CsvRows.cpp"/>
         <source>the cell "%1" of the column "%2" does not fit: %3 was expected</source>
         <translation>die Zelle „%1“ der Spalte „%2“ passt nicht: %3 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRowsColumns.cpp"/>
+        <source>"%1" is not an order of columns: each of the letters P, N, E, Z and D at most once, and - for a column that is skipped, was expected, such as PNEZD</source>
+        <translation>"%1" ist keine Reihenfolge von Spalten: erwartet wurden die Buchstaben P, N, E, Z und D je höchstens einmal, und - für eine Spalte, die übergangen wird, wie PNEZD</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRowsColumns.cpp"/>
+        <source>a header row of variable names was expected</source>
+        <translation>eine Kopfzeile mit Variablennamen wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRowsColumns.cpp"/>
+        <source>a header row was expected</source>
+        <translation>eine Kopfzeile wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRowsColumns.cpp"/>
+        <source>no column of the header row is a variable of the dictionary: a header row of variable names, with the data's delimiter between them, was expected</source>
+        <translation>keine Spalte der Kopfzeile ist eine Variable des Wörterbuchs: eine Kopfzeile mit Variablennamen, dazwischen das Trennzeichen der Daten, wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRowsColumns.cpp"/>
+        <source>no column is a variable of the dictionary: without a header row, columns with their numbers were expected, or an order such as PNEZD</source>
+        <translation>keine Spalte ist eine Variable des Wörterbuchs: ohne Kopfzeile wurden Spalten mit ihren Nummern erwartet oder eine Reihenfolge wie PNEZD</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRowsColumns.cpp"/>
+        <source>the header row holds values that fit the columns, and would be lost if it is data: "header": false (--no-header) was expected, with "skip" for lines that are not data, or "header": true</source>
+        <translation>die Kopfzeile enthält Werte, die zu den Spalten passen, und ginge verloren, wenn sie Daten ist: "header": false (--no-header) wurde erwartet, mit "skip" für Zeilen, die keine Daten sind, oder "header": true</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRowsColumns.cpp"/>
+        <source>the header row holds %1 value that fits its column, and is lost if it is data: "header" true or false was expected, which says what it is</source>
+        <translation>die Kopfzeile enthält %1 Wert, der zu seiner Spalte passt, und geht verloren, wenn sie Daten ist: "header" true oder false wurde erwartet, was sagt, was sie ist</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRowsColumns.cpp"/>
+        <source>the header row holds %1 values that fit their columns, and is lost if it is data: "header" true or false was expected, which says what it is</source>
+        <translation>die Kopfzeile enthält %1 Werte, die zu ihren Spalten passen, und geht verloren, wenn sie Daten ist: "header" true oder false wurde erwartet, was sagt, was sie ist</translation>
     </message>
     <message>
         <location filename="../sources/csv/DelimiterGuess.cpp"/>
@@ -1308,13 +1323,13 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlComparison.cpp"/>
-        <source>%1 is %2 beside the tangents of the element: perhaps the element bends to the other side</source>
-        <translation>%1 liegt %2 neben den Tangenten des Elements: vielleicht biegt das Element zur anderen Seite</translation>
+        <source>the element begins at an angle of %1 to the end of the element before</source>
+        <translation>das Element beginnt in einem Winkel von %1 zum Ende des Elements davor</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>
-        <source>the point "%1" is not in the file</source>
-        <translation>der Punkt „%1“ ist nicht in der Datei</translation>
+        <location filename="../sources/landxml/LandXmlComparison.cpp"/>
+        <source>%1 is %2 beside the tangents of the element: perhaps the element bends to the other side</source>
+        <translation>%1 liegt %2 neben den Tangenten des Elements: vielleicht biegt das Element zur anderen Seite</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>
@@ -1357,12 +1372,12 @@
         <translation>nicht unterstützt: ein Element „%1“ einer Achse oder einer Grenze</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlList.cpp"/>
+        <location filename="../sources/landxml/LandXmlListColumns.cpp"/>
         <source>the dictionary has none of the variables of this list, which are: %1</source>
         <translation>das Verzeichnis hat keine der Variablen dieser Liste; das sind: %1</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlList.cpp"/>
+        <location filename="../sources/landxml/LandXmlListColumns.cpp"/>
         <source>the value of the variable "%1" does not fit: %2 was expected</source>
         <translation>der Wert der Variablen „%1“ passt nicht: %2 wurde erwartet</translation>
     </message>
@@ -1395,6 +1410,11 @@
         <location filename="../sources/landxml/LandXmlNames.cpp"/>
         <source>there are no names to choose from</source>
         <translation>es gibt keine Namen zur Auswahl</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlNotes.cpp"/>
+        <source>and %1 more such difference</source>
+        <translation>und %1 weitere solche Abweichung</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlNotes.cpp"/>
@@ -1493,6 +1513,16 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlReferences.cpp"/>
+        <source>the coordinates of the point "%1" cannot be read</source>
+        <translation>die Koordinaten des Punkts „%1“ sind nicht lesbar</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReferences.cpp"/>
+        <source>the point "%1" is not in the file</source>
+        <translation>der Punkt „%1“ ist nicht in der Datei</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReferences.cpp"/>
         <source>several points have the name "%1" that is referred to: the first one was taken</source>
         <translation>mehrere Punkte haben den Namen „%1“, auf den verwiesen wird: der erste wurde genommen</translation>
     </message>
@@ -1537,6 +1567,26 @@
         <translation>elevationUnit ist „%1“: Höhen werden in der Längeneinheit angenommen</translation>
     </message>
     <message>
+        <location filename="../sources/landxml/LandXmlRowsAlignments.cpp"/>
+        <source>the alignment has %1 grade lines: the first one, "%2", was taken, as the job names none</source>
+        <translation>die Achse hat %1 Gradienten: die erste, „%2“, wurde genommen, da der Auftrag keine nennt</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRowsAlignments.cpp"/>
+        <source>several grade lines of the alignment have the name "%1": the first one was taken</source>
+        <translation>mehrere Gradienten der Achse haben den Namen „%1“: die erste wurde genommen</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRowsAlignments.cpp"/>
+        <source>the alignment has %1 surfaces: the first one, "%2", was taken, as the job names none</source>
+        <translation>die Achse hat %1 Oberflächen: die erste, „%2“, wurde genommen, da der Auftrag keine nennt</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRowsAlignments.cpp"/>
+        <source>several surfaces of the alignment have the name "%1": the first one was taken</source>
+        <translation>mehrere Oberflächen der Achse haben den Namen „%1“: die erste wurde genommen</translation>
+    </message>
+    <message>
         <location filename="../sources/landxml/LandXmlUnits.cpp"/>
         <source>the file has no units: Metric or Imperial in Units was expected</source>
         <translation>die Datei hat keine Einheiten: Metric oder Imperial in Units wurde erwartet</translation>
@@ -1553,8 +1603,23 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlWidths.cpp"/>
+        <source>the width is not listed: staStart, a staEnd after it, startWidth and endWidth were expected</source>
+        <translation>die Breite wird nicht aufgeführt: staStart, ein staEnd dahinter, startWidth und endWidth wurden erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlWidths.cpp"/>
         <source>the widths belong to the alignment "%1", which is not in the file</source>
         <translation>die Breiten gehören zur Achse „%1“, die nicht in der Datei ist</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlWidths.cpp"/>
+        <source>the alignment "%1" has %2 more grade surface, whose widths are not listed</source>
+        <translation>die Achse „%1“ hat %2 weitere Oberfläche, deren Breiten nicht aufgeführt werden</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlWidths.cpp"/>
+        <source>the alignment "%1" has %2 more grade surfaces, whose widths are not listed</source>
+        <translation>die Achse „%1“ hat %2 weitere Oberflächen, deren Breiten nicht aufgeführt werden</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlWidths.cpp"/>
@@ -1642,17 +1707,17 @@
         <translation>die Achse hat die Station %1 an mehreren Stellen</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/StationRows.cpp"/>
+        <location filename="../sources/landxml/StationRowsLoad.cpp"/>
         <source>the alignment has no elements, and therefore no stations</source>
         <translation>die Achse hat keine Elemente und deshalb keine Stationen</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/StationRows.cpp"/>
+        <location filename="../sources/landxml/StationRowsLoad.cpp"/>
         <source>the interval gives more than %1 stations</source>
         <translation>der Abstand ergibt mehr als %1 Stationen</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/StationRows.cpp"/>
+        <location filename="../sources/landxml/StationRowsLoad.cpp"/>
         <source>the line at the offset %1 does not run forward here: the radius of the element is %2</source>
         <translation>die Linie im Abstand %1 läuft hier nicht vorwärts: der Halbmesser des Elements ist %2</translation>
     </message>
@@ -1850,6 +1915,11 @@
         <location filename="../jobs/ColumnNotes.cpp"/>
         <source>the column "%1" is not a variable of the dictionary "%2"</source>
         <translation>die Spalte „%1“ ist keine Variable des Wörterbuchs „%2“</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ColumnNotes.cpp"/>
+        <source>%1 more column is not a variable of the dictionary "%2"</source>
+        <translation>%1 weitere Spalte ist keine Variable des Wörterbuchs "%2"</translation>
     </message>
     <message>
         <location filename="../jobs/ColumnNotes.cpp"/>

@@ -1016,6 +1016,11 @@
         <translation>データを読み込むメモリが足りません</translation>
     </message>
     <message>
+        <location filename="../sources/RowReader.cpp"/>
+        <source>a row has values in several columns whose variables have one ID: that of "%1", the last one, shows</source>
+        <translation>ID が同じ変数の列に複数の値がある行があります: 最後の列 "%1" の値が表示されます</translation>
+    </message>
+    <message>
         <location filename="../sources/SpooledBytes.cpp"/>
         <source>the data cannot be kept in a temporary file: %1</source>
         <translation>データを一時ファイルに保持できません: %1</translation>
@@ -1127,36 +1132,6 @@
     </message>
     <message>
         <location filename="../sources/csv/CsvRows.cpp"/>
-        <source>the header row holds values that fit the columns, and would be lost if it is data: "header": false (--no-header) was expected, with "skip" for lines that are not data</source>
-        <translation>見出し行に列に合う値があります。データであれば失われます: "header": false (--no-header)、データでない行には "skip" が必要です</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvRows.cpp"/>
-        <source>"%1" is not an order of columns: each of the letters P, N, E, Z and D at most once, and - for a column that is skipped, was expected, such as PNEZD</source>
-        <translation>"%1" は列の順序ではありません: 文字 P、N、E、Z、D をそれぞれ 1 回まで、読み飛ばす列には - を使い、PNEZD のように指定する必要があります</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvRows.cpp"/>
-        <source>a header row of variable names was expected</source>
-        <translation>変数名の見出し行が必要です</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvRows.cpp"/>
-        <source>a header row was expected</source>
-        <translation>見出し行が必要です</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvRows.cpp"/>
-        <source>no column of the header row is a variable of the dictionary: a header row of variable names, with the data's delimiter between them, was expected</source>
-        <translation>見出し行に辞書の変数がありません: 変数名をデータの区切り文字で区切った見出し行が必要です</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvRows.cpp"/>
-        <source>no column is a variable of the dictionary: without a header row, columns with their numbers were expected, or an order such as PNEZD</source>
-        <translation>辞書の変数である列がありません: 見出し行がない場合は、番号付きの列、または PNEZD のような順序が必要です</translation>
-    </message>
-    <message>
-        <location filename="../sources/csv/CsvRows.cpp"/>
         <source>the row has %1 cells: %2 were expected, as in the header row</source>
         <translation>行のセル数が %1 です: 見出し行と同じ %2 が必要です</translation>
     </message>
@@ -1169,6 +1144,46 @@
         <location filename="../sources/csv/CsvRows.cpp"/>
         <source>the cell "%1" of the column "%2" does not fit: %3 was expected</source>
         <translation>列「%2」のセル「%1」が不正です: %3が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRowsColumns.cpp"/>
+        <source>"%1" is not an order of columns: each of the letters P, N, E, Z and D at most once, and - for a column that is skipped, was expected, such as PNEZD</source>
+        <translation>"%1" は列の順序ではありません: 文字 P、N、E、Z、D をそれぞれ 1 回まで、読み飛ばす列には - を使い、PNEZD のように指定する必要があります</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRowsColumns.cpp"/>
+        <source>a header row of variable names was expected</source>
+        <translation>変数名の見出し行が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRowsColumns.cpp"/>
+        <source>a header row was expected</source>
+        <translation>見出し行が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRowsColumns.cpp"/>
+        <source>no column of the header row is a variable of the dictionary: a header row of variable names, with the data's delimiter between them, was expected</source>
+        <translation>見出し行に辞書の変数がありません: 変数名をデータの区切り文字で区切った見出し行が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRowsColumns.cpp"/>
+        <source>no column is a variable of the dictionary: without a header row, columns with their numbers were expected, or an order such as PNEZD</source>
+        <translation>辞書の変数である列がありません: 見出し行がない場合は、番号付きの列、または PNEZD のような順序が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRowsColumns.cpp"/>
+        <source>the header row holds values that fit the columns, and would be lost if it is data: "header": false (--no-header) was expected, with "skip" for lines that are not data, or "header": true</source>
+        <translation>見出し行に列に合う値があります。データであれば失われます: "header": false (--no-header)、データでない行には "skip"、または "header": true が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRowsColumns.cpp"/>
+        <source>the header row holds %1 value that fits its column, and is lost if it is data: "header" true or false was expected, which says what it is</source>
+        <translation>見出し行に列に合う値が %1 個あります。データであれば失われます: 見出しかどうかを示す "header" true または false が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvRowsColumns.cpp"/>
+        <source>the header row holds %1 values that fit their columns, and is lost if it is data: "header" true or false was expected, which says what it is</source>
+        <translation>見出し行に列に合う値が %1 個あります。データであれば失われます: 見出しかどうかを示す "header" の true または false が必要です</translation>
     </message>
     <message>
         <location filename="../sources/csv/DelimiterGuess.cpp"/>
@@ -1308,13 +1323,13 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlComparison.cpp"/>
-        <source>%1 is %2 beside the tangents of the element: perhaps the element bends to the other side</source>
-        <translation>%1 は要素の接線から %2 離れています: 要素は反対側に曲がっている可能性があります</translation>
+        <source>the element begins at an angle of %1 to the end of the element before</source>
+        <translation>要素の始点の方向が、前の要素の終点の方向と%1だけ異なります</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>
-        <source>the point "%1" is not in the file</source>
-        <translation>点「%1」がファイルにありません</translation>
+        <location filename="../sources/landxml/LandXmlComparison.cpp"/>
+        <source>%1 is %2 beside the tangents of the element: perhaps the element bends to the other side</source>
+        <translation>%1 は要素の接線から %2 離れています: 要素は反対側に曲がっている可能性があります</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>
@@ -1357,12 +1372,12 @@
         <translation>未対応：線形または境界の要素「%1」</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlList.cpp"/>
+        <location filename="../sources/landxml/LandXmlListColumns.cpp"/>
         <source>the dictionary has none of the variables of this list, which are: %1</source>
         <translation>辞書にこの一覧の変数が一つもありません。変数は次のとおりです: %1</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/LandXmlList.cpp"/>
+        <location filename="../sources/landxml/LandXmlListColumns.cpp"/>
         <source>the value of the variable "%1" does not fit: %2 was expected</source>
         <translation>変数「%1」の値が合いません: %2 が必要です</translation>
     </message>
@@ -1395,6 +1410,11 @@
         <location filename="../sources/landxml/LandXmlNames.cpp"/>
         <source>there are no names to choose from</source>
         <translation>選べる名前はありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlNotes.cpp"/>
+        <source>and %1 more such difference</source>
+        <translation>ほかに同様の相違が %1 件あります</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlNotes.cpp"/>
@@ -1493,6 +1513,16 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlReferences.cpp"/>
+        <source>the coordinates of the point "%1" cannot be read</source>
+        <translation>点「%1」の座標を読み取れません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReferences.cpp"/>
+        <source>the point "%1" is not in the file</source>
+        <translation>点「%1」がファイルにありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlReferences.cpp"/>
         <source>several points have the name "%1" that is referred to: the first one was taken</source>
         <translation>参照先の名前「%1」の点が複数あります: 最初の点を使いました</translation>
     </message>
@@ -1537,6 +1567,26 @@
         <translation>elevationUnit は「%1」です：高さは長さの単位とみなします</translation>
     </message>
     <message>
+        <location filename="../sources/landxml/LandXmlRowsAlignments.cpp"/>
+        <source>the alignment has %1 grade lines: the first one, "%2", was taken, as the job names none</source>
+        <translation>線形に計画縦断線が %1 本あります: ジョブに指定がないため、最初の「%2」を使いました</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRowsAlignments.cpp"/>
+        <source>several grade lines of the alignment have the name "%1": the first one was taken</source>
+        <translation>線形の複数の計画縦断線に「%1」という名前があります: 最初のものを使いました</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRowsAlignments.cpp"/>
+        <source>the alignment has %1 surfaces: the first one, "%2", was taken, as the job names none</source>
+        <translation>線形にサーフェスが %1 個あります: ジョブに指定がないため、最初の「%2」を使いました</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlRowsAlignments.cpp"/>
+        <source>several surfaces of the alignment have the name "%1": the first one was taken</source>
+        <translation>線形の複数のサーフェスに「%1」という名前があります: 最初のものを使いました</translation>
+    </message>
+    <message>
         <location filename="../sources/landxml/LandXmlUnits.cpp"/>
         <source>the file has no units: Metric or Imperial in Units was expected</source>
         <translation>ファイルに単位がありません: Units の中に Metric または Imperial が必要です</translation>
@@ -1553,8 +1603,23 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlWidths.cpp"/>
+        <source>the width is not listed: staStart, a staEnd after it, startWidth and endWidth were expected</source>
+        <translation>幅員は表示されません: staStart、それより後の staEnd、startWidth、endWidth が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlWidths.cpp"/>
         <source>the widths belong to the alignment "%1", which is not in the file</source>
         <translation>幅員は線形「%1」のものですが、その線形はファイルにありません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlWidths.cpp"/>
+        <source>the alignment "%1" has %2 more grade surface, whose widths are not listed</source>
+        <translation>線形「%1」にはほかに %2 個の計画面があり、その幅員は表示されません</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlWidths.cpp"/>
+        <source>the alignment "%1" has %2 more grade surfaces, whose widths are not listed</source>
+        <translation>線形「%1」にはほかに %2 個の計画面があり、それらの幅員は表示されません</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlWidths.cpp"/>
@@ -1642,17 +1707,17 @@
         <translation>線形の複数の箇所に測点 %1 があります</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/StationRows.cpp"/>
+        <location filename="../sources/landxml/StationRowsLoad.cpp"/>
         <source>the alignment has no elements, and therefore no stations</source>
         <translation>線形に要素がないため、測点がありません</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/StationRows.cpp"/>
+        <location filename="../sources/landxml/StationRowsLoad.cpp"/>
         <source>the interval gives more than %1 stations</source>
         <translation>この間隔では測点が %1 を超えます</translation>
     </message>
     <message>
-        <location filename="../sources/landxml/StationRows.cpp"/>
+        <location filename="../sources/landxml/StationRowsLoad.cpp"/>
         <source>the line at the offset %1 does not run forward here: the radius of the element is %2</source>
         <translation>オフセット %1 の線はここで前方に進みません: 要素の半径は %2 です</translation>
     </message>
@@ -1850,6 +1915,11 @@
         <location filename="../jobs/ColumnNotes.cpp"/>
         <source>the column "%1" is not a variable of the dictionary "%2"</source>
         <translation>列「%1」は辞書「%2」の変数ではありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ColumnNotes.cpp"/>
+        <source>%1 more column is not a variable of the dictionary "%2"</source>
+        <translation>さらに %1 列が辞書 "%2" の変数ではありません</translation>
     </message>
     <message>
         <location filename="../jobs/ColumnNotes.cpp"/>

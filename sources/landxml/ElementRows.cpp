@@ -122,10 +122,13 @@ bool ElementRows::load()
     if (!readNamedAlignments(model_)) {
         return false;
     }
+    const bool isIntersectionAsked = isAsked("PINorthing") || isAsked("PIEasting");
     for (const LandXmlRoute &route : model_.routes) {
         for (std::size_t i = 0; i < route.pieces.size(); ++i) {
             rows_.emplace_back(&route, i);
-            noteIntersection(route, route.pieces[i]);
+            if (isIntersectionAsked) {
+                noteIntersection(route, route.pieces[i]);
+            }
         }
     }
     count_ = rows_.size();

@@ -20,7 +20,7 @@ bool isLongArc(const LandXmlElement &element)
 }
 
 std::variant<PlanePoint, LandXmlFault> centreOfCurve(const LandXmlElement &element, const LandXmlEnds &ends,
-                                                     bool isRight)
+                                                     bool isRight, double tolerance)
 {
     if (element.centre.isGiven()) {
         return positionOf(element.centre);
@@ -28,12 +28,28 @@ std::variant<PlanePoint, LandXmlFault> centreOfCurve(const LandXmlElement &eleme
     if (!isGiven(element.radius)) {
         return LandXmlFault{missingGeometry("Center"), element.byte};
     }
-    const auto centre = centreOfArc(ends.start, ends.end, element.radius, isRight, isLongArc(element));
+    const auto centre = centreOfArc(ends.start, ends.end, element.radius, isRight, isLongArc(element), tolerance);
     if (!centre) {
         return LandXmlFault{Xlate("the element has no geometry: its radius does not reach from its start to its end"),
                             element.byte};
     }
     return *centre;
+}
+
+/// The arc of the stated radius between the ends. About half a circle, the digits of the ends say next to nothing of how far it
+/// turns: what the file says besides does, where it leads to the end.
+FittedCurve arcOfRadius(const LandXmlElement &element, const LandXmlEnds &ends, bool isRight, double tolerance)
+{
+    const double radius = element.radius;
+    const double chord = distanceBetween(ends.start, ends.end);
+    if (std::fabs(chord - 2 * radius) <= tolerance) {
+        for (const double turn : {std::fabs(element.delta), element.length / radius}) { // not a number where not given
+            if (std::fabs(2 * radius * std::sin(turn / 2) - chord) <= tolerance) {
+                return arcTowards(ends.start, ends.end, radius, isRight, turn);
+            }
+        }
+    }
+    return arcOver(ends.start, ends.end, radius, isRight, isLongArc(element), tolerance);
 }
 
 /// Whether an arc of the stated length ends about where the file has its end. Lengths have few digits, and of several turns
@@ -54,7 +70,7 @@ LandXmlCurves arcOf(const LandXmlElement &element, const LandXmlEnds &ends, doub
     if (!isRight) {
         return LandXmlFault{missingGeometry("rot=\"cw\" or rot=\"ccw\""), element.byte};
     }
-    const auto centre = centreOfCurve(element, ends, *isRight);
+    const auto centre = centreOfCurve(element, ends, *isRight, tolerance);
     if (const auto *fault = std::get_if<LandXmlFault>(&centre)) {
         return *fault;
     }
@@ -62,8 +78,8 @@ LandXmlCurves arcOf(const LandXmlElement &element, const LandXmlEnds &ends, doub
     const bool hasCentre = element.centre.isGiven();
     const double radius = hasCentre ? distanceBetween(middle, ends.start) : element.radius;
     const double stated = isGiven(element.length) ? element.length : std::fabs(element.delta) * radius;
-    const FittedCurve fitted = hasCentre ? arcAbout(middle, ends.start, ends.end, *isRight)
-                                         : arcOver(ends.start, ends.end, radius, *isRight, isLongArc(element));
+    const FittedCurve fitted =
+        hasCentre ? arcAbout(middle, ends.start, ends.end, *isRight) : arcOfRadius(element, ends, *isRight, tolerance);
     const auto *curve = std::get_if<PlaneCurve>(&fitted);
     // Where start and end are one point, or so near to each other that their digits decide which comes first, the length
     // alone tells a full circle from nothing, and several turns from one. One that leads elsewhere is a mistake.

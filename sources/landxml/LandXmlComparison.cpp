@@ -19,6 +19,17 @@ constexpr double (*readings[])(double) = {
     [](double angle) { return std::numbers::pi / 2 - angle; }, // counterclockwise from east
 };
 
+/// What a bearing at an end of a curve would be, if the curve bent to the other side of its chord.
+double mirrored(const PlaneCurve &curve, double bearing)
+{
+    return 2 * bearingBetween(curve.start().point, curve.end().point) - bearing;
+}
+
+bool isTransition(const PlaneCurve &curve)
+{
+    return !curve.isLine() && !curve.isArc();
+}
+
 } // namespace
 
 void LandXmlComparison::note(std::size_t byte, const char *what, const QString &stated, const QString &computed)
@@ -48,16 +59,19 @@ void LandXmlComparison::area(std::size_t byte, const char *what, double stated, 
     }
 }
 
-/// How far the direction of an element of a length may be off, when its ends are by the tolerance of lengths.
-double LandXmlComparison::allowedTurn(double length) const
+/// How far the direction of an element may be off, when its points are by the tolerance of lengths: its ends, or the centre that
+/// it turns about.
+double LandXmlComparison::allowedTurn(const PlaneCurve &curve) const
 {
-    return std::max(tolerance_.angle, tolerance_.length / length);
+    const double bend = std::max(std::fabs(curve.startCurvature()), std::fabs(curve.endCurvature()));
+    return std::max(tolerance_.angle, tolerance_.length * std::max(1 / curve.length(), bend));
 }
 
-void LandXmlComparison::direction(std::size_t byte, const char *what, double stated, double bearing, double length)
+void LandXmlComparison::direction(std::size_t byte, const char *what, double stated, double bearing,
+                                  const PlaneCurve &curve)
 {
     if (!std::isnan(stated)) {
-        directions_.push_back({byte, what, stated, bearing, allowedTurn(length)});
+        directions_.push_back({byte, what, stated, bearing, allowedTurn(curve)});
     }
 }
 
@@ -108,12 +122,21 @@ void LandXmlComparison::corner(std::size_t byte, const PlaneCurve &before, const
     if (before.isLine() && curve.isLine()) {
         return; // lines may meet at any angle
     }
-    const double turn = turnBetween(before.end().bearing, curve.start().bearing);
-    if (!(std::fabs(turn) <= allowedTurn(before.length()) + allowedTurn(curve.length()))) {
+    const double end = before.end().bearing;
+    const double start = curve.start().bearing;
+    const double allowed = allowedTurn(before) + allowedTurn(curve);
+    const auto fits = [allowed](double from, double to) { return std::fabs(turnBetween(from, to)) <= allowed; };
+    if (fits(end, start)) {
+        return;
+    }
+    const QString angle = landXmlAngleText(turnBetween(end, start), units_.angle);
+    if (fits(end, mirrored(curve, start)) || fits(mirrored(before, end), start)) {
         notes_.add(byte,
                    Xlate("the element begins at an angle of %1 to the end of the element before: perhaps one of them "
                          "bends to the other side")
-                       .arg(landXmlAngleText(turn, units_.angle)));
+                       .arg(angle));
+    } else if (isTransition(before) || isTransition(curve)) {
+        notes_.add(byte, Xlate("the element begins at an angle of %1 to the end of the element before").arg(angle));
     }
 }
 

@@ -35,15 +35,15 @@ public:
     /// Areas are stated with few digits: they may differ by one part in a thousand, or a tenth of a square metre; by more or
     /// less in proportion to another tolerance of lengths than the default one.
     void area(std::size_t byte, const char *what, double stated, double computed);
-    /// Keeps a direction for `noteDirections`. The shorter an element is, the more its direction depends on the digits of
-    /// its ends. @param length  of the element
-    void direction(std::size_t byte, const char *what, double stated, double bearing, double length);
+    /// Keeps a direction for `noteDirections`. The shorter an element is, and the smaller its radius, the more its direction
+    /// depends on the digits of its points.
+    void direction(std::size_t byte, const char *what, double stated, double bearing, const PlaneCurve &curve);
     /// Compares the end of an element.
     void end(std::size_t byte, PlanePoint stated, PlanePoint computed);
     /// Notes an element that does not begin where the one before ends. @param width  how far it is
     void gap(std::size_t byte, double width);
-    /// Notes an element that does not continue in the direction of the one before: mostly because one of both bends to the
-    /// wrong side.
+    /// Notes an element that does not continue in the direction of the one before, where it would if one of both bent to the
+    /// other side, or where one of both is a transition. Other lines and arcs may meet at any angle.
     void corner(std::size_t byte, const PlaneCurve &before, const PlaneCurve &curve);
     /// The point where the tangents meet has to lie on both.
     void intersection(std::size_t byte, PlanePoint stated, const PlaneCurve &curve);
@@ -65,7 +65,7 @@ private:
 
     void note(std::size_t byte, const char *what, const QString &stated, const QString &computed);
     QString lengthText(double metres) const;
-    double allowedTurn(double length) const;
+    double allowedTurn(const PlaneCurve &curve) const;
 
     LandXmlUnits units_;
     LandXmlTolerance tolerance_;

@@ -1,5 +1,6 @@
 #include "LandXmlCurveParts.h"
 
+#include "LandXmlReferences.h"
 #include "Xlate.h"
 
 namespace kareport
@@ -18,7 +19,7 @@ std::variant<PlanePoint, LandXmlFault> positionOf(const LandXmlCoordinates &at)
     if (at.position) {
         return *at.position;
     }
-    return LandXmlFault{Xlate("the point \"%1\" is not in the file").arg(shortText(at.reference)), at.byte};
+    return LandXmlFault{noPosition(at.reference, at.isUnreadable), at.byte};
 }
 
 QString textOf(CurveFault fault)

@@ -101,8 +101,8 @@ void compareWithStated(const LandXmlElement &element, const LandXmlEnds &ends, c
         comparison.length(element.byte, "radius", element.radius, std::fabs(1 / curve.startCurvature()));
     }
     comparison.direction(element.byte, element.kind == LandXmlElement::Kind::Line ? "dir" : "dirStart",
-                         element.direction, curve.start().bearing, curve.length());
-    comparison.direction(element.byte, "dirEnd", element.directionEnd, curve.end().bearing, curve.length());
+                         element.direction, curve.start().bearing, curve);
+    comparison.direction(element.byte, "dirEnd", element.directionEnd, curve.end().bearing, curve);
     if (element.intersection.position) {
         comparison.intersection(element.byte, *element.intersection.position, curve);
     }

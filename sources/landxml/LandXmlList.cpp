@@ -1,9 +1,6 @@
 #include "LandXmlList.h"
 
 #include "EntryOrder.h"
-#include "LandXmlTexts.h"
-#include "TextFolding.h"
-#include "Xlate.h"
 
 #include <algorithm>
 #include <numeric>
@@ -58,25 +55,6 @@ std::vector<LandXmlVariable> LandXmlList::variables(const LandXmlQuery &query)
     // Which they are does not depend on the file.
     const auto nothing = std::make_shared<FileBytes>();
     return LandXmlRows::make({nothing, LandXmlHeader(), query, {}})->variables();
-}
-
-void LandXmlList::bind(const FindVariable &findVariable)
-{
-    QStringList known;
-    for (const LandXmlVariable &variable : rows_->variables()) {
-        if (const auto parser = findVariable(variable.name)) {
-            const bool isFirst = std::none_of(columns_.begin(), columns_.end(),
-                                              [&](const Column &column) { return column.parser.id() == parser->id(); });
-            columns_.push_back({*parser, names_.size(), variable.type, isFirst});
-        }
-        names_.push_back(variable.name);
-        known.append(variable.name);
-    }
-    if (columns_.empty()) {
-        error_ = InputError{file_->path(), std::nullopt,
-                            Xlate("the dictionary has none of the variables of this list, which are: %1")
-                                .arg(known.join(QStringLiteral(", ")))};
-    }
 }
 
 UDataObject *LandXmlList::GetAt(std::size_t index)
@@ -154,55 +132,6 @@ bool LandXmlList::readRow(RowBatch &batch)
     batch.error = storeValues(batch.next(), nullptr);
     batch.count += batch.error ? 0U : 1U;
     return !batch.error;
-}
-
-bool LandXmlList::storeNumber(const Column &column, double number, UDataObject &object) const
-{
-    const auto text = column.parser.takesAnyText() ? landXmlText(number, column.type, settings_) : std::nullopt;
-    return text ? column.parser.store(text->toStdString(), object) : column.parser.storeNumber(number, object);
-}
-
-/// Stores the values of the row at hand. @return what is wrong with one
-std::optional<InputError> LandXmlList::storeValues(UDataObject &object, const std::vector<unsigned> *onlyIds) const
-{
-    for (const Column &column : columns_) {
-        const ValueParser &parser = column.parser;
-        if (onlyIds != nullptr && std::find(onlyIds->begin(), onlyIds->end(), parser.id()) == onlyIds->end()) {
-            continue;
-        }
-        const LandXmlValue value = rows_->value(column.variable);
-        if (column.isFirst && std::holds_alternative<std::monostate>(value)) {
-            object.Remove(parser.id()); // of an earlier row
-        }
-        bool fits = true;
-        if (const auto *number = std::get_if<double>(&value)) {
-            fits = storeNumber(column, *number, object);
-        } else if (const auto *text = std::get_if<std::string_view>(&value)) {
-            fits = parser.store(*text, object);
-        }
-        if (!fits) {
-            return InputError{file_->path(), FilePlaces(*file_).of(rows_->byte()),
-                              Xlate("the value of the variable \"%1\" does not fit: %2 was expected")
-                                  .arg(names_[column.variable], parser.expected())};
-        }
-    }
-    return std::nullopt;
-}
-
-std::optional<SourceColumns> LandXmlList::columns() const
-{
-    SourceColumns found;
-    found.source = file_->path();
-    for (const QString &name : names_) {
-        SourceColumn &column = found.columns.emplace_back();
-        column.name = name;
-        column.isOffered = true;
-    }
-    for (const Column &column : columns_) {
-        found.columns[column.variable].isKnown = true;
-        found.variables.append(foldedKey(names_[column.variable]));
-    }
-    return found;
 }
 
 void LandXmlList::Sort(const std::vector<unsigned> &ids)

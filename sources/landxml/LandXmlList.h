@@ -1,6 +1,7 @@
 #pragma once
 
 #include "DataUnits.h"
+#include "FilePlaces.h"
 #include "LandXmlQuery.h"
 #include "LandXmlRows.h"
 #include "RowBatches.h"
@@ -27,6 +28,10 @@ public:
                 ReadProgress progress, const UJobSettings &settings = {});
     ~LandXmlList() override;
 
+    /// Says which variables are shown, of those that the dictionary has; without it, all. What concerns others alone is not noted.
+    /// To be called before rows are asked for.
+    void setShown(const QStringList &variables);
+
     /// What the values are in, whatever the file's units are: metre, square metre, radian.
     static DataUnits units();
     /// The variables that the rows of a query have, with the value types that suit them.
@@ -38,6 +43,8 @@ public:
     void Sort(const std::vector<unsigned> &ids) override;
 
     std::optional<InputError> error() const override { return error_; }
+    /// The place of the element that the row is made of.
+    ValuePlace placeOf(std::size_t index, const QString &variable) override;
     /// Differences in a file whose rows are sound, and the kinds of elements that no list reads. Nothing before the rows have
     /// come to their end.
     std::vector<InputError> notes() const override;
@@ -73,6 +80,7 @@ private:
     const RowBatch *batch_ = nullptr;
     std::size_t batchStart_ = 0;
     std::optional<InputError> error_;
+    std::unique_ptr<FilePlaces> places_; ///< once one was asked for
     bool stopped_ = false;
     std::unique_ptr<RowBatches> batches_; ///< last, so that its thread ends before what it reads goes
 };

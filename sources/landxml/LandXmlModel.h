@@ -26,6 +26,7 @@ struct LandXmlCoordinates
     std::string reference; ///< name of a point
     std::string name;
     std::size_t byte = 0;
+    bool isUnreadable = false; ///< the point that is referred to has coordinates that cannot be read
 
     bool isGiven() const { return position.has_value() || !reference.empty(); }
 };
@@ -169,6 +170,8 @@ struct LandXmlWidth
     double staEnd = notGiven;
     double atStart = notGiven;
     double atEnd = notGiven;
+    std::size_t byte = 0;
+    bool isUnreadable = false; ///< a number of it cannot be read, which was noted
 };
 
 /// A stretch beside an alignment, such as a lane.

@@ -17,6 +17,13 @@ void LandXmlNotes::add(std::size_t byte, const QString &text)
     placed_.push_back({byte, text});
 }
 
+void LandXmlNotes::addOfFile(const QString &text)
+{
+    if (ofFile_.size() < most) {
+        ofFile_.push_back(text);
+    }
+}
+
 void LandXmlNotes::leaveOut(std::string_view element, std::size_t count)
 {
     element = element.substr(0, longestName);
@@ -34,6 +41,7 @@ void LandXmlNotes::clear()
 {
     placed_.clear();
     more_ = 0;
+    ofFile_.clear();
     passedOver_.clear();
     otherKinds_ = 0;
 }
@@ -50,7 +58,10 @@ std::vector<InputError> LandXmlNotes::all() const
     }
     const auto add = [&](const QString &text) { notes.push_back({file_->path(), std::nullopt, text}); };
     if (more_ > 0) {
-        add(Xlate("and %1 more such differences").arg(more_));
+        add((more_ == 1 ? Xlate("and %1 more such difference") : Xlate("and %1 more such differences")).arg(more_));
+    }
+    for (const QString &text : ofFile_) {
+        add(text);
     }
     for (const auto &[element, count] : passedOver_) {
         add(Xlate("%1: %2 in the file, which no list reads")

@@ -22,6 +22,8 @@ public:
     explicit LandXmlNotes(std::shared_ptr<const FileBytes> file) : file_(std::move(file)) {}
 
     void add(std::size_t byte, const QString &text);
+    /// Adds what is said of the file as a whole, and is no difference.
+    void addOfFile(const QString &text);
     /// Counts elements that no list reads, or that are in one.
     void leaveOut(std::string_view element, std::size_t count = 1);
     void clear();
@@ -42,6 +44,7 @@ private:
     std::shared_ptr<const FileBytes> file_;
     std::vector<Note> placed_;
     std::size_t more_ = 0;
+    std::vector<QString> ofFile_;
     std::map<std::string, std::size_t, std::less<>> passedOver_;
     std::size_t otherKinds_ = 0;
 };

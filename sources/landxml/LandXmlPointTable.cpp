@@ -6,7 +6,7 @@ namespace kareport
 void LandXmlPointTable::add(const LandXmlPoint &point)
 {
     const std::string &reference = point.at.reference;
-    const bool isAlias = !point.at.position && (reference == point.name || reference == point.id);
+    const bool isAlias = !point.at.position && !reference.empty() && (reference == point.name || reference == point.id);
     if (isAlias || (point.name.empty() && point.id.empty())) {
         return;
     }
@@ -61,6 +61,21 @@ bool LandXmlPointTable::isAmbiguous(const Known &known, Next next) const
         known.isAmbiguous = other != nullptr;
     }
     return *known.isAmbiguous;
+}
+
+bool LandXmlPointTable::isUnreadable(std::string_view name) const
+{
+    for (int step = 0; step <= longestChain; ++step) {
+        const Known *const point = known(name).first;
+        if (point == nullptr || point->entry->position) {
+            return false;
+        }
+        if (point->entry->reference.empty()) {
+            return true;
+        }
+        name = point->entry->reference;
+    }
+    return false;
 }
 
 std::optional<LandXmlPointTable::Found> LandXmlPointTable::find(std::string_view name) const

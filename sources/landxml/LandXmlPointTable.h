@@ -31,6 +31,8 @@ public:
         std::string_view description;
         bool isAmbiguous = false; ///< several points have the name
     };
+    /// Whether the point of a name is there, and its coordinates, or those of the point that it refers to, cannot be read.
+    bool isUnreadable(std::string_view name) const;
     /// The point of a name. It may itself refer to another one, and what it does not say is then that one's. Nothing when
     /// there is no such point, or it refers to itself in the end.
     std::optional<Found> find(std::string_view name) const;

@@ -23,12 +23,15 @@ struct LandXmlWants
     bool parcels = false;
     bool gradeSurfaces = false; ///< the widths beside alignments
 
-    /// The alignment and the parcel that are asked for by their names; all where a name is empty. A number that cannot be
-    /// read in another one is noted, and is no error.
+    /// The alignment, the parcel, and the group or surface of points that are asked for by their names; all where a name is
+    /// empty. A number that cannot be read in another one is noted, and is no error.
     std::string alignment;
     std::string parcel;
+    std::string owner;
     /// Whether such a number is noted wherever it is, since names and numbers of elements alone are wanted.
     bool isTolerant = false;
+    /// Whether points are looked up by their names: one whose coordinates cannot be read is there, without a position.
+    bool isForReferences = false;
 };
 
 /// Reads a LandXML file in one pass. Alignments and parcels are kept; points are kept until they are taken, so that a file
@@ -133,6 +136,7 @@ private:
     bool isInGradeModel_ = false;         ///< its widths are listed as they are: a wrong one is no error
     bool isZoneRight_ = false;            ///< the zones that are open
     bool isInAlignment_ = false;          ///< one that is wanted is open
+    bool isInPoint_ = false;              ///< one that is wanted is open
     int parcelDepth_ = 0;                 ///< parcels that are open
     std::vector<std::size_t> parcelPath_; ///< their indexes, the innermost last, where they are wanted
 };

@@ -46,6 +46,7 @@ void LandXmlReader::beginPoint(Tag tag, const XmlAttributes &attributes)
     if (point.name.empty() || tag == Tag::SurfacePoint) {
         std::swap(point.name, point.id);
     }
+    isInPoint_ = true;
     point.owner = openOwners_.back();
     point.at.position.reset();
     point.at.height = notGiven;

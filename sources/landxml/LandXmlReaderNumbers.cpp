@@ -24,8 +24,11 @@ bool LandXmlReader::isNeeded() const
     const auto isAskedFor = [](const std::string &wanted, const std::string &name) {
         return wanted.empty() || wanted == name;
     };
-    if (wants_.isTolerant || isInGradeModel_) {
+    if (wants_.isTolerant || wants_.isForReferences || isInGradeModel_) {
         return false;
+    }
+    if (isInPoint_) {
+        return isAskedFor(wants_.owner, owners_[openOwners_.back()]);
     }
     if (!parcelPath_.empty()) {
         return isAskedFor(wants_.parcel, parcels[parcelPath_.back()].name);

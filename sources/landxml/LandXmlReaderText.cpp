@@ -32,9 +32,10 @@ void LandXmlReader::end(Tag tag)
     switch (tag) {
     case Tag::Point:
     case Tag::SurfacePoint:
-        if (takeCoordinates(points_[pointCount_].at)) {
+        if (takeCoordinates(points_[pointCount_].at) || wants_.isForReferences) {
             addPoint();
         }
+        isInPoint_ = false;
         break;
     case Tag::Start:
     case Tag::End:

@@ -2,6 +2,8 @@
 #include "LandXmlReader.h"
 #include "LandXmlTags.h"
 
+#include <cmath>
+
 namespace kareport
 {
 
@@ -36,8 +38,18 @@ void LandXmlReader::beginZone(const XmlAttributes &attributes)
 
 LandXmlWidth LandXmlReader::widthOf(const XmlAttributes &attributes)
 {
-    return {length(attributes, "staStart"), length(attributes, "staEnd"), length(attributes, "startWidth"),
-            length(attributes, "endWidth")};
+    LandXmlWidth width;
+    width.byte = stream_.currentByte();
+    const auto take = [&](const char *name) {
+        const double taken = length(attributes, name);
+        width.isUnreadable = width.isUnreadable || (std::isnan(taken) && !attributes.text(name).empty());
+        return taken;
+    };
+    width.staStart = take("staStart");
+    width.staEnd = take("staEnd");
+    width.atStart = take("startWidth");
+    width.atEnd = take("endWidth");
+    return width;
 }
 
 } // namespace kareport

@@ -24,6 +24,7 @@ void resolve(LandXmlCoordinates &at, const LandXmlPointTable &points, LandXmlNot
 {
     const auto found = isReference(at) ? points.find(at.reference) : std::nullopt;
     if (!found) {
+        at.isUnreadable = isReference(at) && points.isUnreadable(at.reference);
         return;
     }
     if (found->isAmbiguous) {
@@ -43,6 +44,14 @@ void resolve(std::vector<LandXmlElement> &elements, const LandXmlPointTable &poi
             resolve(*at, points, notes);
         }
     }
+}
+
+QString noPosition(const std::string &name, bool isUnreadable)
+{
+    constexpr std::size_t longest = 100;
+    const QString text = isUnreadable ? Xlate("the coordinates of the point \"%1\" cannot be read")
+                                      : Xlate("the point \"%1\" is not in the file");
+    return text.arg(QString::fromStdString(name.substr(0, longest)));
 }
 
 void noteAmbiguous(const std::string &name, std::size_t byte, LandXmlNotes &notes)

@@ -4,6 +4,9 @@
 #include "LandXmlNotes.h"
 #include "LandXmlPointTable.h"
 
+#include <QString>
+
+#include <string>
 #include <vector>
 
 namespace kareport
@@ -19,6 +22,9 @@ bool hasReferences(const std::vector<LandXmlElement> &elements);
 void resolve(LandXmlCoordinates &at, const LandXmlPointTable &points, LandXmlNotes &notes);
 /// The same for all coordinates of elements.
 void resolve(std::vector<LandXmlElement> &elements, const LandXmlPointTable &points, LandXmlNotes &notes);
+
+/// Says why a point that is referred to has no position. @param isUnreadable  it is in the file, but its coordinates cannot be read
+QString noPosition(const std::string &name, bool isUnreadable);
 
 /// Says that several points have a name that is referred to. @param byte  of the reference
 void noteAmbiguous(const std::string &name, std::size_t byte, LandXmlNotes &notes);

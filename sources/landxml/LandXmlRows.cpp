@@ -3,7 +3,6 @@
 #include "AlignmentRows.h"
 #include "CourseRows.h"
 #include "ElementRows.h"
-#include "LandXmlReferences.h"
 #include "ParcelRows.h"
 #include "PointRows.h"
 #include "ProfileRows.h"
@@ -14,7 +13,6 @@
 
 #include <QStringList>
 
-#include <algorithm>
 #include <array>
 #include <utility>
 
@@ -137,6 +135,7 @@ const LandXmlPointTable *LandXmlRows::pointTable()
         LandXmlNotes unheard(source_.file); // the pass that makes the rows has them, too
         LandXmlWants wants;
         wants.points = true;
+        wants.isForReferences = true; // one that nobody refers to may be wrong
         LandXmlReader reader(source_.file, source_.header.units, wants, unheard);
         for (bool isMore = true; isMore;) {
             isMore = reader.readSome();
@@ -171,59 +170,6 @@ std::unique_ptr<LandXmlReader> LandXmlRows::readAll(const LandXmlWants &wants)
     position_ = reader->position();
     error_ = reader->error();
     return error_ ? nullptr : std::move(reader);
-}
-
-bool LandXmlRows::readAlignments(AlignmentModel &model, LandXmlWants wants)
-{
-    const LandXmlQuery &query = source_.query;
-    wants.alignments = true;
-    wants.alignment = (query.kind == Kind::OffsetsOf ? query.alignment : query.name).toStdString();
-    const auto reader = readAll(wants);
-    if (!reader) {
-        return false;
-    }
-    model.alignments = std::move(reader->alignments);
-    model.widths.fill(reader->gradeSurfaces, model.alignments, modelNotes_);
-    return true;
-}
-
-bool LandXmlRows::makeRoutes(AlignmentModel &model, const std::vector<LandXmlAlignment *> &alignments)
-{
-    const bool refers = std::any_of(alignments.begin(), alignments.end(), [](const LandXmlAlignment *alignment) {
-        return hasReferences(alignment->elements);
-    });
-    const LandXmlPointTable *points = refers ? pointTable() : nullptr;
-    if (refers && points == nullptr) {
-        return false;
-    }
-    for (LandXmlAlignment *alignment : alignments) {
-        if (points != nullptr) {
-            resolve(alignment->elements, *points, modelNotes_);
-        }
-    }
-    LandXmlComparison comparison(source_.header.units, source_.query.tolerance, modelNotes_);
-    model.routes = routesOf({alignments.begin(), alignments.end()}, comparison, modelNotes_);
-    for (const LandXmlRoute &route : model.routes) {
-        if (route.stationFault) {
-            fail(*route.stationFault);
-            return false;
-        }
-    }
-    return true;
-}
-
-bool LandXmlRows::readNamedAlignments(AlignmentModel &model, const LandXmlWants &wants)
-{
-    if (!readAlignments(model, wants)) {
-        return false;
-    }
-    std::vector<LandXmlAlignment *> named;
-    for (LandXmlAlignment &alignment : model.alignments) {
-        if (isNamed(alignment.name)) {
-            named.push_back(&alignment);
-        }
-    }
-    return makeRoutes(model, named);
 }
 
 bool LandXmlRows::expectNames()

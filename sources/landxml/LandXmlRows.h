@@ -12,6 +12,7 @@
 #include "RowList.h"
 
 #include <QString>
+#include <QStringList>
 
 #include <memory>
 #include <optional>
@@ -52,6 +53,8 @@ public:
     static std::unique_ptr<LandXmlRows> make(LandXmlSource source);
 
     virtual std::vector<LandXmlVariable> variables() const = 0;
+    /// Says which variables are asked for; all where it is not called. What concerns others alone is not noted.
+    void setAsked(const QStringList &variables) { asked_ = variables; }
     /// Goes on to the next row. @return false after the last one, and when something is wrong
     virtual bool next() = 0;
     /// Goes back before the first row.
@@ -65,6 +68,8 @@ public:
     virtual LandXmlValue value(std::size_t variable) const = 0;
     /// Where the row at hand comes from.
     virtual std::size_t byte() const = 0;
+    /// The same of a row by its number from 0, after all were gone through; nothing where there is no such row.
+    virtual std::optional<std::size_t> byteOf(std::size_t index) = 0;
     /// Bytes of the file that were read.
     std::size_t position() const { return position_; }
     const std::optional<InputError> &error() const { return error_; }
@@ -90,6 +95,15 @@ protected:
     bool isNamed(const std::string &name) { return names_.matches(name); }
     /// Fails where a name that the query asks for has not been met. @return whether all were
     bool expectNames();
+    /// Whether a variable is asked for.
+    bool isAsked(const char *variable) const
+    {
+        return !asked_ || asked_->contains(QLatin1StringView(variable), Qt::CaseInsensitive);
+    }
+    /// Notes lines of an alignment of which the first is taken, where the query names none or several have the name: heights are
+    /// those of one line.
+    void noteOtherGradeLines(const LandXmlAlignment &alignment);
+    void noteOtherSurfaces(const LandXmlAlignment &alignment);
 
     LandXmlSource source_;
     LandXmlNames names_;      ///< of groups, surfaces, parcels or alignments
@@ -102,6 +116,7 @@ protected:
     bool isStopped_ = false;
 
 private:
+    std::optional<QStringList> asked_;
     std::unique_ptr<LandXmlPointTable> pointTable_;
 };
 

@@ -1,5 +1,8 @@
 #include "LandXmlTexts.h"
 
+#include "FixedNotation.h"
+#include "UFormatAngle.h"
+#include "UFormatBearing.h"
 #include "VariableType.h"
 
 #include <cmath>
@@ -7,21 +10,58 @@
 namespace kareport
 {
 
-std::optional<QString> landXmlText(double metres, int type, const UJobSettings &settings)
+namespace
 {
-    const bool isStation = type == VARIABLE_STATION;
-    const bool isLength = type == VARIABLE_LENGTH || type == VARIABLE_DISTANCE || type == VARIABLE_COORDINATE ||
-                          type == VARIABLE_ELEVATION;
-    if (!isLength && !isStation) {
-        return std::nullopt;
+
+QString numberText(double number, const UJobSettings &settings)
+{
+    const FixedNotation notation(number, settings.numberDecimals);
+    const std::string_view digits = notation.digits();
+    const QString text = QString::fromLatin1(digits.data(), static_cast<qsizetype>(digits.size()));
+    return number < 0 && !notation.isZero() ? u'-' + text : text;
+}
+
+QString bearingText(double shown, const UJobSettings &settings)
+{
+    QString text;
+    UFormatBearing(settings.bearingUnit, settings.bearingStyle, settings.bearingDecimals, settings.bearingPadding,
+                   settings.bearingReference)
+        .ConvertToDisplayString(shown, text);
+    UFormatAngle::ConvertToDMSformatString(settings.angleMarks[0], settings.angleMarks[1], settings.angleMarks[2],
+                                           text);
+    return text;
+}
+
+QString offsetText(double shown, const UJobSettings &settings)
+{
+    const QString text = settings.UnitLengthToString(std::fabs(shown), false, false, -1, -1, false);
+    return shown < 0 ? text + u'L' : shown > 0 ? text + u'R' : text;
+}
+
+} // namespace
+
+std::optional<QString> landXmlText(double value, int type, const UJobSettings &settings)
+{
+    const double shown = settings.ConvertToDisplay(value, type, 0);
+    const bool isInfinite = std::isinf(value);
+    const QString infinite = value < 0 ? QStringLiteral("-INF") : QStringLiteral("INF");
+    switch (type) {
+    case VARIABLE_LENGTH:
+    case VARIABLE_DISTANCE:
+    case VARIABLE_COORDINATE:
+    case VARIABLE_ELEVATION:
+        return isInfinite ? infinite : settings.UnitLengthToString(shown, false, false, -1, -1, false);
+    case VARIABLE_STATION:
+        return isInfinite ? infinite
+                          : settings.StationToString(shown, false, false, false, -1, -1, false, false, false, true,
+                                                     false, true);
+    case VARIABLE_OFFSET: return isInfinite ? infinite : offsetText(shown, settings);
+    case VARIABLE_AREA:
+    case VARIABLE_ANGLE:
+    case VARIABLE_VANGLE: return isInfinite ? infinite : numberText(shown, settings);
+    case VARIABLE_BEARING: return isInfinite ? infinite : bearingText(shown, settings);
+    default: return std::nullopt;
     }
-    if (std::isinf(metres)) {
-        return metres < 0 ? QStringLiteral("-INF") : QStringLiteral("INF");
-    }
-    const double shown = settings.ConvertToDisplay(metres, type, 0);
-    return isStation
-               ? settings.StationToString(shown, false, false, false, -1, -1, false, false, false, true, false, true)
-               : settings.UnitLengthToString(shown, false, false, -1, -1, false);
 }
 
 } // namespace kareport

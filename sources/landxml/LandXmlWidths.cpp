@@ -32,14 +32,22 @@ double widthAt(const std::vector<LandXmlWidth> &pieces, double station)
 
 } // namespace
 
-bool LandXmlWidths::add(const LandXmlZone &stored)
+bool LandXmlWidths::add(const LandXmlZone &stored, LandXmlNotes &notes)
 {
     constexpr std::size_t most = 100;
     if (zones_.size() == most) {
         return false;
     }
     Zone zone{stored.isRight, stored.widths.empty() ? std::vector(1, stored.whole) : stored.widths};
-    std::erase_if(zone.pieces, [](const LandXmlWidth &piece) { return !isWhole(piece); });
+    std::erase_if(zone.pieces, [&notes](const LandXmlWidth &piece) {
+        const bool isNone =
+            std::isnan(piece.atStart) && std::isnan(piece.atEnd); // the file does not say how wide it is
+        if (!isWhole(piece) && !isNone && !piece.isUnreadable) {
+            notes.add(piece.byte, Xlate("the width is not listed: staStart, a staEnd after it, startWidth and endWidth "
+                                        "were expected"));
+        }
+        return !isWhole(piece);
+    });
     std::stable_sort(zone.pieces.begin(), zone.pieces.end(), [](const LandXmlWidth &left, const LandXmlWidth &right) {
         return left.staStart < right.staStart;
     });
@@ -72,20 +80,42 @@ void LandXmlWidthTable::fill(const std::vector<LandXmlGradeSurface> &surfaces,
                                         .arg(QString::fromStdString(surface.alignment.substr(0, 100))));
             continue;
         }
-        for (const LandXmlZone &zone : surface.zones) {
-            if (!known->second.add(zone)) {
-                notes.add(surface.byte,
-                          Xlate("the alignment has too many zones: the widths of the last ones are not listed"));
-                break;
-            }
+        take(surface, known->second, notes);
+    }
+    for (const LandXmlAlignment &alignment : alignments) {
+        std::size_t &others = byName_.find(alignment.name)->second.others;
+        if (others > 0) {
+            const QString sentence =
+                others == 1 ? Xlate("the alignment \"%1\" has %2 more grade surface, whose widths are not listed")
+                            : Xlate("the alignment \"%1\" has %2 more grade surfaces, whose widths are not listed");
+            notes.addOfFile(
+                sentence.arg(QString::fromStdString(alignment.name.substr(0, 100)), QString::number(others)));
+        }
+        others = 0; // several may have the name
+    }
+}
+
+void LandXmlWidthTable::take(const LandXmlGradeSurface &surface, Known &known, LandXmlNotes &notes)
+{
+    bool isOther = false;
+    for (const LandXmlZone &zone : surface.zones) {
+        std::optional<std::size_t> &side = zone.isRight ? known.right : known.left;
+        side = side.value_or(surface.byte);
+        if (*side != surface.byte) {
+            isOther = true;
+        } else if (!known.widths.add(zone, notes)) {
+            notes.add(surface.byte,
+                      Xlate("the alignment has too many zones: the widths of the last ones are not listed"));
+            break;
         }
     }
+    known.others += isOther ? 1U : 0U;
 }
 
 const LandXmlWidths *LandXmlWidthTable::find(const std::string &alignment) const
 {
     const auto known = byName_.find(alignment);
-    return known != byName_.end() ? &known->second : nullptr;
+    return known != byName_.end() ? &known->second.widths : nullptr;
 }
 
 } // namespace kareport

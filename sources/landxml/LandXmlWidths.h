@@ -3,6 +3,8 @@
 #include "LandXmlModel.h"
 #include "LandXmlNotes.h"
 
+#include <cstddef>
+#include <optional>
 #include <string>
 #include <unordered_map>
 #include <vector>
@@ -15,8 +17,9 @@ class LandXmlWidths
 {
 public:
     /// Adds a zone, unless there are more than a road has: a place would have to look at each of them.
+    /// @param notes  receives widths that are not whole
     /// @return whether it was added
-    bool add(const LandXmlZone &stored);
+    bool add(const LandXmlZone &stored, LandXmlNotes &notes);
 
     /// The width of all zones of a side together, in metres; not a number where no zone has one. Where two pieces of a zone
     /// meet, that of the piece ahead.
@@ -38,14 +41,26 @@ private:
 class LandXmlWidthTable
 {
 public:
-    /// @param notes  receives zones that cannot be taken
+    /// Takes the zones of each side from the first grade surface of the alignment that has some: others are other layers of the
+    /// same road. @param notes  receives what is not taken
     void fill(const std::vector<LandXmlGradeSurface> &surfaces, const std::vector<LandXmlAlignment> &alignments,
               LandXmlNotes &notes);
     /// The widths beside an alignment; null where the file has none. Valid as long as the table.
     const LandXmlWidths *find(const std::string &alignment) const;
 
 private:
-    std::unordered_map<std::string, LandXmlWidths> byName_; ///< of all alignments
+    /// The widths beside an alignment, and the bytes of the grade surfaces that those of its left and its right side are from.
+    struct Known
+    {
+        LandXmlWidths widths;
+        std::optional<std::size_t> left;
+        std::optional<std::size_t> right;
+        std::size_t others = 0; ///< grade surfaces with zones that were not taken
+    };
+
+    static void take(const LandXmlGradeSurface &surface, Known &known, LandXmlNotes &notes);
+
+    std::unordered_map<std::string, Known> byName_; ///< of all alignments
 };
 
 } // namespace kareport

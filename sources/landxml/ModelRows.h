@@ -27,6 +27,14 @@ public:
         index_ = index;
         take(index);
     }
+    std::optional<std::size_t> byteOf(std::size_t index) final
+    {
+        if (!isSound_ || index >= count_) {
+            return std::nullopt;
+        }
+        goTo(index);
+        return byte();
+    }
 
 protected:
     using LandXmlRows::LandXmlRows;

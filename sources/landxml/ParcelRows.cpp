@@ -52,9 +52,7 @@ bool BorderRows::resolveReferences(const std::vector<LandXmlParcel *> &parcels)
         resolve(parcel->elements, *points, modelNotes_);
         resolve(parcel->centre, *points, modelNotes_);
         if (isReference(parcel->centre)) {
-            modelNotes_.add(
-                parcel->centre.byte,
-                Xlate("the point \"%1\" is not in the file").arg(QString::fromStdString(parcel->centre.reference)));
+            modelNotes_.add(parcel->centre.byte, noPosition(parcel->centre.reference, parcel->centre.isUnreadable));
         }
     }
     return true;

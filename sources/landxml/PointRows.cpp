@@ -50,6 +50,8 @@ void PointRows::startReading()
 {
     LandXmlWants wants;
     (isOfSurfaces() ? wants.surfacePoints : wants.points) = true;
+    wants.owner = source_.query.name.toStdString();
+    bytes_.clear();
     passNotes_.clear();
     unheard_.clear();
     reader_ = std::make_unique<LandXmlReader>(source_.file, source_.header.units, wants,
@@ -124,8 +126,19 @@ bool PointRows::next()
     if (!take()) {
         return false;
     }
+    if (!isKept_) {
+        bytes_.push_back(point_->at.byte);
+    }
     noteNames();
     return true;
+}
+
+std::optional<std::size_t> PointRows::byteOf(std::size_t index)
+{
+    if (isKept_) {
+        return index < kept_.size() ? std::optional(kept_[index].at.byte) : std::nullopt;
+    }
+    return index < bytes_.size() ? std::optional(bytes_[index]) : std::nullopt;
 }
 
 void PointRows::goTo(std::size_t index)
@@ -148,8 +161,8 @@ bool PointRows::take()
     }
     referred_ = points->find(point_->at.reference);
     if (!referred_) {
-        fail(point_->at.byte,
-             Xlate("the point \"%1\" is not in the file").arg(QString::fromStdString(point_->at.reference)));
+        const std::string &name = point_->at.reference;
+        fail(point_->at.byte, noPosition(name, points->isUnreadable(name)));
         return false;
     }
     at_ = referred_->position;

@@ -3,6 +3,8 @@
 #include "LandXmlRows.h"
 #include "SeenHashes.h"
 
+#include <deque>
+
 namespace kareport
 {
 
@@ -23,6 +25,7 @@ public:
     void goTo(std::size_t index) override;
     LandXmlValue value(std::size_t variable) const override;
     std::size_t byte() const override { return point_->at.byte; }
+    std::optional<std::size_t> byteOf(std::size_t index) override;
 
 protected:
     /// Takes the point at hand. @return false when something is wrong with it
@@ -54,6 +57,7 @@ private:
     std::vector<bool> isOwnerWanted_;
     bool isKept_ = false;
     std::vector<LandXmlPoint> kept_;
+    std::deque<std::size_t> bytes_;     ///< of the rows, where they are not kept
     SeenHashes seen_;                   ///< of names
     std::vector<std::uint64_t> hashes_; ///< of the names of the points that were read
 };

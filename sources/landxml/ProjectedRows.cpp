@@ -78,6 +78,9 @@ bool ProjectedRows::load()
     for (const LandXmlGradeLine &line : alignment->gradeLines) {
         gradeLines_.matches(line.name);
     }
+    if (isAsked("Design") || isAsked("HeightDifference")) {
+        noteOtherGradeLines(*alignment);
+    }
     error_ = gradeLines_.error(source_.file->path());
     route_ = &model_.routes.front();
     if (error_ || !checkElements()) {

@@ -3,6 +3,9 @@
 #include "VariableType.h"
 #include "Xlate.h"
 
+#include <algorithm>
+#include <cmath>
+
 namespace kareport
 {
 
@@ -63,7 +66,7 @@ bool SectionRows::load()
 {
     LandXmlWants wants;
     wants.sections = true;
-    wants.gradeSurfaces = true;
+    wants.gradeSurfaces = isAsked("LeftWidth") || isAsked("RightWidth");
     if (!readNamedAlignments(model_, wants)) {
         return false;
     }
@@ -82,11 +85,20 @@ bool SectionRows::load()
     return expectNames();
 }
 
+/// How far along the alignment a section is. Stations have few digits: one that these put before the start or after the end is
+/// at it.
+double SectionRows::distanceOf(const LandXmlRoute &route, const LandXmlSection &section) const
+{
+    const double distance = section.station - route.stationing.start();
+    const double inside = std::clamp(distance, 0.0, route.alignment.length());
+    return std::fabs(distance - inside) <= source_.query.tolerance.length ? inside : distance;
+}
+
 /// Notes a section that is beyond the ends of its alignment: its points have no coordinates.
 void SectionRows::noteStation(const LandXmlRoute &route, const LandXmlSection &section)
 {
     const bool isBeside = !route.fault && !route.alignment.elements().empty();
-    if (isBeside && !route.alignment.at(section.station - route.stationing.start())) {
+    if (isBeside && !route.alignment.at(distanceOf(route, section))) {
         modelNotes_.add(section.byte,
                         Xlate("the cross section is before the start or after the end of the alignment: its "
                               "points have no coordinates"));
@@ -103,7 +115,7 @@ void SectionRows::take(std::size_t index)
     index_ = row.point;
     if (isNew) {
         const bool isPlaced = !route_->fault && !section_->isSkew;
-        place_ = isPlaced ? route_->alignment.at(section_->station - route_->stationing.start()) : std::nullopt;
+        place_ = isPlaced ? route_->alignment.at(distanceOf(*route_, *section_)) : std::nullopt;
     }
 }
 

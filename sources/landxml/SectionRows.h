@@ -29,6 +29,7 @@ private:
         std::size_t point;
     };
 
+    double distanceOf(const LandXmlRoute &route, const LandXmlSection &section) const;
     void noteStation(const LandXmlRoute &route, const LandXmlSection &section);
 
     AlignmentModel model_;

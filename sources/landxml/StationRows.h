@@ -37,6 +37,7 @@ private:
     };
 
     void lookAtNames(const LandXmlAlignment &alignment);
+    bool isDesignAsked() const;
     bool addRoute(std::size_t index);
     void noteOffsetsPastCentres(const LandXmlRoute &route);
     const LandXmlRoute::Piece *borderAt(double distance, bool &isEnd) const;

@@ -136,6 +136,10 @@ TEST(CurveFit, AnArcOverItsEndsNeedsNoCentre)
     EXPECT_TRUE(std::holds_alternative<CurveFault>(arcOver({1, 1}, {1, 1}, 5, true, false)));
     EXPECT_TRUE(std::holds_alternative<CurveFault>(
         arcOver({0, 0}, {6, 0}, std::numeric_limits<double>::infinity(), true, false)));
+    EXPECT_TRUE(std::holds_alternative<CurveFault>(arcOver({0, 0}, {6.001, 0}, 3, true, false)));
+    EXPECT_TRUE(std::holds_alternative<PlaneCurve>(arcOver({0, 0}, {6.001, 0}, 3, true, false, 0.002)));
+    EXPECT_TRUE(centreOfArc({0, 0}, {6.001, 0}, 3, true, false, 0.002));
+    EXPECT_FALSE(centreOfArc({0, 0}, {6.003, 0}, 3, true, false, 0.002));
     EXPECT_TRUE(std::holds_alternative<PlaneCurve>(arcOver({0, 0}, {6.000001, 0}, 3, true, false)))
         << "half a circle of rounded points";
 }

@@ -17,8 +17,9 @@ QByteArray landXmlTemplate()
 {
     QByteArray variables;
     int id = 0;
-    for (const auto &[name, type] : {std::pair("Name", "NUMBER"), std::pair("Northing", "COORDINATE"),
-                                     std::pair("Station", "STATION"), std::pair("Easting1", "COORDINATE")})
+    for (const auto &[name, type] :
+         {std::pair("Name", "NUMBER"), std::pair("Northing", "COORDINATE"), std::pair("Station", "STATION"),
+          std::pair("Easting1", "COORDINATE"), std::pair("PINorthing", "COORDINATE")})
     {
         variables += "<Variable><ID>" + QByteArray::number(++id) + "</ID><VariableName>" + name +
                      "</VariableName><Type>" + type + "</Type></Variable>";
@@ -30,6 +31,8 @@ QByteArray landXmlTemplate()
     return "<ReportTemplate><Name>T</Name><Title>T</Title><Tables>" +
            table("Points", fieldOf("Name", "4") + fieldOf("Northing", "9.3")) +
            table("Places", fieldOf("Station", "9.3") + fieldOf("Easting1", "9.3")) +
+           table("Elements", fieldOf("Name", "4")) +
+           table("Intersections", fieldOf("Name", "4") + fieldOf("PINorthing", "9.3")) +
            "</Tables><Dictionaries><Dictionary><DictionaryName>D</DictionaryName><VariableList>" + variables +
            "</VariableList></Dictionary></Dictionaries><Blocks><Block><Name>First</Name><Use>D</Use><OutputList>" +
            fieldOf("Name", "4") +
@@ -109,6 +112,29 @@ TEST(LandXmlData, WhatIsSaidOfTheFileIsNoted)
     EXPECT_TRUE(job.error) << "of a block as well";
     run(job, points, QByteArray(pointsStep) + ", " + pointsStep, road(twice));
     EXPECT_EQ(job.notes.said().size(), 1U) << "each is said once";
+}
+
+TEST(LandXmlData, WhatATableDoesNotShowIsNotNoted)
+{
+    const QByteArray halfCircle =
+        "<LandXML version='1.2'><Units><Metric linearUnit='meter'/></Units>\n<Alignments><Alignment name='road' "
+        "staStart='0'><CoordGeom>\n  <Curve name='7' rot='cw'><Start>0 0</Start><Center>0 50</Center><End>0 100</End>"
+        "</Curve></CoordGeom></Alignment></Alignments></LandXML>";
+    const char *elements = R"("landxml": "road.xml", "list": "elements")";
+    TestJob job;
+    run(job, elements, R"({"table": "Elements", "data": "d"})", halfCircle, R"("strict": true, )");
+    EXPECT_FALSE(job.error) << job.text().toStdString();
+    EXPECT_TRUE(job.notes.all().empty()) << "the dictionary has the PI, but the table does not show it";
+    run(job, elements, R"({"table": "Intersections", "data": "d"})", halfCircle);
+    ASSERT_EQ(job.notes.said().size(), 2U);
+    EXPECT_TRUE(job.notes.said()[0].message().endsWith(
+        u"road.xml:3:3: note: the tangents of the element are parallel: it has no PI"));
+    const kareport::JobNote &missing = job.notes.said()[1];
+    EXPECT_EQ(missing.kind, kareport::JobNote::Kind::MissingValue);
+    EXPECT_TRUE(missing.dataFile.endsWith(u"road.xml")) << "the place of a value is that of its element";
+    ASSERT_TRUE(missing.dataPlace);
+    EXPECT_EQ(missing.dataPlace->line, 3);
+    EXPECT_EQ(missing.dataPlace->column, 3);
 }
 
 TEST(LandXmlData, MistakesHaveTheirPlace)

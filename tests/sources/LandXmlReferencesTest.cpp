@@ -91,6 +91,45 @@ TEST(LandXmlReferences, PointsOfASurveyAreReadLikeOthers)
                                          u"SurveyHeader: 1 in the file, which no list reads"_qs}));
 }
 
+TEST(LandXmlReferences, APointThatNobodyRefersToMayBeWrong)
+{
+    const QByteArray spoiled = "\n<CgPoints name='other'><CgPoint name='p'>1,5 2</CgPoint>"
+                               "<CgPoint name='alias' pntRef='p'/></CgPoints>";
+    const auto line = [](const char *end) {
+        return alignment(QByteArray("<Line><Start>0 0</Start><End pntRef='") + end + "'/></Line>");
+    };
+    const QStringList variables = {QStringLiteral("EndNorthing"), QStringLiteral("EndEasting")};
+    LandXmlFile sound(fileOf(points + line("c") + spoiled), queryOf(Kind::Elements), variables);
+    EXPECT_EQ(sound.rows(0), QStringList(u"5|5"_qs));
+    EXPECT_FALSE(sound.list->error());
+    EXPECT_EQ(sound.notes(), QStringList());
+    for (const char *name : {"p", "alias"}) {
+        LandXmlFile wrong(fileOf(points + line(name) + spoiled), queryOf(Kind::Elements), variables);
+        EXPECT_EQ(wrong.rows(0), QStringList(u"-|-"_qs));
+        ASSERT_EQ(wrong.notes().size(), 1) << name;
+        EXPECT_TRUE(wrong.notes()[0].endsWith(
+            u": the coordinates of the point \"%1\" cannot be read"_qs.arg(QLatin1StringView(name))))
+            << wrong.notes()[0].toStdString();
+    }
+}
+
+TEST(LandXmlReferences, APointOfAnotherGroupMayBeWrong)
+{
+    const QByteArray content = fileOf("<CgPoints name='good'><CgPoint name='1'>1 2</CgPoint></CgPoints>"
+                                      "\n<CgPoints name='bad'><CgPoint name='2'>1,5 2</CgPoint></CgPoints>");
+    LandXmlFile good(content, queryOf(Kind::Points, "good"), {QStringLiteral("Name")});
+    EXPECT_EQ(good.rows(), QStringList(u"1"_qs));
+    EXPECT_FALSE(good.list->error());
+    ASSERT_EQ(good.notes().size(), 1);
+    EXPECT_TRUE(good.notes()[0].startsWith(u"5:22: \"1,5\" does not fit")) << good.notes()[0].toStdString();
+    for (const char *group : {"bad", ""}) {
+        LandXmlFile bad(content, queryOf(Kind::Points, group), {QStringLiteral("Name")});
+        bad.rows();
+        ASSERT_TRUE(bad.list->error()) << group;
+        EXPECT_EQ(placeText(bad.list->error()), u"5:22"_qs) << group;
+    }
+}
+
 TEST(LandXmlReferences, ReadingThePointsCanBeStopped)
 {
     QByteArray many = "<CgPoints>";

@@ -69,6 +69,19 @@ TEST(LandXmlSections, BesideAnAlignmentWithoutGeometryHaveNoCoordinates)
     EXPECT_EQ(file.rows(0), QStringList(u"5|1|-"_qs));
 }
 
+TEST(LandXmlSections, AtAnEndThatIsRoundedHaveItsCoordinates)
+{
+    // The road is 307.0796 m long. A file with two decimals has its end at 307.08, and one that is off by more is not there.
+    const QByteArray surface = "<CrossSectSurf><PntList2D>1 2</PntList2D></CrossSectSurf></CrossSect>";
+    LandXmlFile file(withSections("<CrossSect sta='-0.001'>" + surface + "<CrossSect sta='307.081'>" + surface +
+                                  "\n<CrossSect sta='307.09'>" + surface + "\n<CrossSect sta='-0.01'>" + surface),
+                     queryOf(Kind::CrossSections), {QStringLiteral("Northing"), QStringLiteral("Easting")});
+    EXPECT_EQ(file.rows(2), QStringList({u"1000.00|501.00"_qs, u"1199.00|650.00"_qs, u"-|-"_qs, u"-|-"_qs}));
+    ASSERT_EQ(file.notes().size(), 2) << file.notes().join(u'\n').toStdString();
+    EXPECT_TRUE(file.notes()[0].startsWith(u"9:1: the cross section is before the start or after the end"));
+    EXPECT_TRUE(file.notes()[1].startsWith(u"10:1: "));
+}
+
 TEST(LandXmlSections, AtASkewHaveNoCoordinates)
 {
     const QByteArray surface = "<CrossSectSurf><PntList2D>1 2</PntList2D></CrossSectSurf></CrossSect>";

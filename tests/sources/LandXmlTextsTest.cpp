@@ -66,12 +66,42 @@ TEST(LandXmlTexts, StationsAreWrittenAsTheReportDoesAndAreBlankWhereThereAreNone
     EXPECT_EQ(textsOf(content, query, variables, hundreds).value(1), u"15+00|0+90|1|100.000"_qs);
 }
 
-TEST(LandXmlTexts, OtherNumbersAreNumbers)
+TEST(LandXmlTexts, AnglesAndBearingsAreInTheUnitOfTheReport)
 {
-    EXPECT_EQ(textsOf(fileOf(alignment(bend())), queryOf(Kind::Elements),
-                      {QStringLiteral("Element"), QStringLiteral("Deflection")})
-                  .value(1),
-              u"2|1.5707963267948966"_qs);
+    const QStringList variables = {QStringLiteral("Deflection"), QStringLiteral("EndBearing")};
+    const QByteArray content = fileOf(alignment(bend()));
+    EXPECT_EQ(textsOf(content, queryOf(Kind::Elements), variables).value(1), u"90.000|N 90\u00B000'00\" E"_qs);
+    UJobSettings gon;
+    gon.angleUnit = AngleUnit::Gon;
+    gon.numberDecimals = 1;
+    gon.bearingUnit = 2;
+    gon.bearingStyle = 0;
+    gon.bearingDecimals = 2;
+    EXPECT_EQ(textsOf(content, queryOf(Kind::Elements), variables, gon).value(1), u"100.0|100.00g"_qs);
+}
+
+TEST(LandXmlTexts, OffsetsAndAreasAreInTheUnitOfTheReport)
+{
+    LandXmlQuery query = queryOf(Kind::Stations);
+    query.offsets = {{-3.048, {}}, {3.048, {}}, {0, {}}};
+    UJobSettings feet;
+    feet.lengthUnit = LengthUnit::InternationalFoot;
+    feet.areaUnit = AreaUnit::Hectare;
+    feet.lengthDecimals = 2;
+    const QStringList offsets = {QStringLiteral("Offset1"), QStringLiteral("Offset2"), QStringLiteral("Offset3")};
+    EXPECT_EQ(textsOf(fileOf(alignment(bend())), query, offsets, feet).value(0), u"10.00L|10.00R|0.00"_qs);
+    const QByteArray section = "<CrossSects><CrossSect sta='5' areaCut='25000' areaFill='-0.0001'><CrossSectSurf>"
+                               "<PntList2D>1 2</PntList2D></CrossSectSurf></CrossSect></CrossSects>";
+    EXPECT_EQ(textsOf(fileOf(alignment(bend(), "name='road' staStart='0'", {}, section)), queryOf(Kind::CrossSections),
+                      {QStringLiteral("Offset"), QStringLiteral("CutArea"), QStringLiteral("FillArea")}, feet)
+                  .value(0),
+              u"3.28R|2.500|0.000"_qs);
+}
+
+TEST(LandXmlTexts, NumbersWithoutAUnitAreNumbers)
+{
+    EXPECT_EQ(textsOf(fileOf(alignment(bend())), queryOf(Kind::Elements), {QStringLiteral("Element")}).value(1),
+              u"2"_qs);
 }
 
 } // namespace

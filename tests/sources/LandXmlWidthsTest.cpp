@@ -55,9 +55,50 @@ TEST(LandXmlWidths, ThatAreWrongAreNoError)
                      queryOf(Kind::Stations), {QStringLiteral("LeftWidth")});
     EXPECT_EQ(file.rows(), QStringList({u"-"_qs, u"-"_qs}));
     EXPECT_FALSE(file.list->error());
-    ASSERT_EQ(file.notes().size(), 2);
+    ASSERT_EQ(file.notes().size(), 3);
     EXPECT_TRUE(file.notes()[0].startsWith(u"6:") && file.notes()[0].contains(u"staEnd=\"x\""));
-    EXPECT_EQ(file.notes()[1], u"7:13: the widths belong to the alignment \"gone\", which is not in the file"_qs);
+    EXPECT_TRUE(
+        file.notes()[1].endsWith(u": the width is not listed: staStart, a staEnd after it, startWidth and endWidth "
+                                 u"were expected"))
+        << file.notes()[1].toStdString();
+    EXPECT_EQ(file.notes()[2], u"7:13: the widths belong to the alignment \"gone\", which is not in the file"_qs);
+}
+
+TEST(LandXmlWidths, WithoutAnEndAreNotedAndNotListed)
+{
+    LandXmlFile file(road("<Zones side='left'>\n<Zone staStart='1000' staEnd='1100' startWidth='3'/>"
+                          "\n<Zone staStart='1000' staEnd='1100' category='Verge'/></Zones>"),
+                     queryOf(Kind::Stations), {QStringLiteral("LeftWidth")});
+    EXPECT_EQ(file.rows(), QStringList({u"-"_qs, u"-"_qs}));
+    EXPECT_EQ(file.notes(), QStringList(u"7:1: the width is not listed: staStart, a staEnd after it, startWidth and "
+                                        "endWidth were expected"_qs))
+        << "a zone that has no width at all is sound";
+}
+
+TEST(LandXmlWidths, OfSeveralGradeSurfacesAreNotAddedTogether)
+{
+    const auto zones = [](const char *side, const char *width) {
+        return QByteArray("<Zones side='") + side + "'><Zone staStart='1000' staEnd='1100' startWidth='" + width +
+               "' endWidth='" + width + "'/></Zones>";
+    };
+    const QByteArray others = "<GradeModel><GradeSurface name='base' alignmentRef='road'>" + zones("left", "5") +
+                              zones("right", "6") + "</GradeSurface><GradeSurface name='frost' alignmentRef='road'>" +
+                              zones("right", "7") + "</GradeSurface></GradeModel>";
+    const QStringList widths = {QStringLiteral("LeftWidth"), QStringLiteral("RightWidth")};
+    LandXmlFile file(road(zones("left", "3"), others), queryOf(Kind::Stations), widths);
+    EXPECT_EQ(file.rows(1).value(0), u"3.0|6.0"_qs) << "each side has those of the first surface that has some";
+    EXPECT_EQ(file.notes(),
+              QStringList(u"the alignment \"road\" has 2 more grade surfaces, whose widths are not listed"_qs))
+        << "which is no mistake of the file: it has no place";
+    LandXmlFile one(road(zones("left", "3"), "<GradeModel><GradeSurface alignmentRef='road'>" + zones("left", "4") +
+                                                 "</GradeSurface></GradeModel>"),
+                    queryOf(Kind::Stations), widths);
+    one.rows();
+    EXPECT_EQ(one.notes(),
+              QStringList(u"the alignment \"road\" has 1 more grade surface, whose widths are not listed"_qs));
+    LandXmlFile without(road(zones("left", "3"), others), queryOf(Kind::Stations), {QStringLiteral("Station")});
+    without.rows();
+    EXPECT_EQ(without.notes(), QStringList()) << "no width is listed";
 }
 
 TEST(LandXmlWidths, OfMoreZonesThanARoadHasAreLeftOut)
