@@ -951,12 +951,12 @@
         <translation>die Variable "%1" hat zwei Spalten: jede Variable wurde einmal erwartet</translation>
     </message>
     <message>
-        <location filename="../sources/FileBytesPosix.cpp"/>
+        <location filename="../sources/FileBytes.cpp"/>
         <source>the file was cut short while it was read</source>
         <translation>die Datei wurde beim Lesen abgeschnitten</translation>
     </message>
     <message>
-        <location filename="../sources/FileBytesPosix.cpp"/>
+        <location filename="../sources/FileBytes.cpp"/>
         <source>the pipe or device gives more than %1 MB, the most that was expected</source>
         <translation>mehr als %1 MB kommen aus einer Quelle, die keine Datei ist</translation>
     </message>
@@ -2729,18 +2729,18 @@
     </message>
     <message>
         <location filename="../apps/kareport/CommandLineJob.cpp"/>
+        <source>kareport: stopped; nothing was written</source>
+        <translation>kareport: abgebrochen; es wurde nichts geschrieben</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineJobChecks.cpp"/>
         <source>kareport: the report will have at least %1</source>
         <translation>kareport: der Bericht wird mindestens %1 haben</translation>
     </message>
     <message>
-        <location filename="../apps/kareport/CommandLineJob.cpp"/>
+        <location filename="../apps/kareport/CommandLineJobChecks.cpp"/>
         <source>kareport: nothing was written: the report has at least %1, more than the limit of %2</source>
         <translation>kareport: nichts wurde geschrieben: der Bericht hat mindestens %1, mehr als die Grenze von %2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CommandLineJob.cpp"/>
-        <source>kareport: stopped; nothing was written</source>
-        <translation>kareport: abgebrochen; es wurde nichts geschrieben</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CommandOutputs.cpp"/>

@@ -951,12 +951,12 @@
         <translation>変数 "%1" に列が 2 つあります: 各変数は 1 回だけ必要です</translation>
     </message>
     <message>
-        <location filename="../sources/FileBytesPosix.cpp"/>
+        <location filename="../sources/FileBytes.cpp"/>
         <source>the file was cut short while it was read</source>
         <translation>読み込み中にファイルが切り詰められました</translation>
     </message>
     <message>
-        <location filename="../sources/FileBytesPosix.cpp"/>
+        <location filename="../sources/FileBytes.cpp"/>
         <source>the pipe or device gives more than %1 MB, the most that was expected</source>
         <translation>ファイルではない入力から %1 MB を超えるデータが読み込まれました</translation>
     </message>
@@ -2729,18 +2729,18 @@
     </message>
     <message>
         <location filename="../apps/kareport/CommandLineJob.cpp"/>
+        <source>kareport: stopped; nothing was written</source>
+        <translation>kareport: 中断されました。何も書き込まれていません</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/CommandLineJobChecks.cpp"/>
         <source>kareport: the report will have at least %1</source>
         <translation>kareport: レポートは少なくとも %1 になります</translation>
     </message>
     <message>
-        <location filename="../apps/kareport/CommandLineJob.cpp"/>
+        <location filename="../apps/kareport/CommandLineJobChecks.cpp"/>
         <source>kareport: nothing was written: the report has at least %1, more than the limit of %2</source>
         <translation>kareport: 何も書き込まれませんでした: レポートは少なくとも %1 で、上限の %2 を超えます</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CommandLineJob.cpp"/>
-        <source>kareport: stopped; nothing was written</source>
-        <translation>kareport: 中断されました。何も書き込まれていません</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CommandOutputs.cpp"/>
