@@ -85,7 +85,7 @@ std::optional<InputError> JobRunner::run(UReportDoc &report, ReportTextWriter *s
     report.SetSurroundings(surroundings);
     const auto restoredHooks =
         qScopeGuard([&report, before = ReportAccess::hooks(report)] { ReportAccess::setHooks(report, before); });
-    ReportAccess::setHooks(report, {placeholders_.get(), &remarks, results_});
+    ReportAccess::setHooks(report, {placeholders_.get(), &remarks, results_, cells_});
     if (auto error = prepare(report)) {
         return error;
     }
@@ -95,8 +95,8 @@ std::optional<InputError> JobRunner::run(UReportDoc &report, ReportTextWriter *s
     report.StreamText(stream);
     const auto kept = qScopeGuard([&report] { report.StreamText(nullptr); });
     const std::function<bool()> isStopped = [this, stream, &report] {
-        return isInterrupted() || (stream != nullptr && stream->hasFailed()) || isTooLarge(job_, leastSize(report)) ||
-               (isToStop_ && isToStop_());
+        return (heedsInterrupts_ && isInterrupted()) || (stream != nullptr && stream->hasFailed()) ||
+               isTooLarge(job_, leastSize(report)) || (isToStop_ && isToStop_());
     };
     JobData data(job_, source_, progress_, isStopped);
     notes_ = JobNotes();

@@ -10,6 +10,7 @@
 #include "ResultOutputs.h"
 #include "StepFit.h"
 #include "UReportDoc.h"
+#include "WrittenCells.h"
 
 #include <functional>
 #include <memory>
@@ -39,6 +40,12 @@ public:
 
     /// Sets what is asked now and then, besides the interrupts, whether the work is to stop.
     void stopWhen(std::function<bool()> isToStop) { isToStop_ = std::move(isToStop); }
+
+    /// Has it go on when the program is asked to stop its work (`isInterrupted`): what stops it is `stopWhen` alone.
+    void ignoreInterrupts() { heedsInterrupts_ = false; }
+    /// Says what receives where the report shows the fields of its tables and blocks; null for none. It must outlive the
+    /// runs. The text is not to be handed on meanwhile.
+    void setCells(WrittenCells *cells) { cells_ = cells; }
 
     /// Makes a note an error: the report is not made then, and the notes so far are kept.
     void beStrict() { isStrict_ = true; }
@@ -72,6 +79,8 @@ private:
     Progress &progress_;
     std::function<bool()> isToStop_;
     ResultOutputs *results_ = nullptr;
+    WrittenCells *cells_ = nullptr;
+    bool heedsInterrupts_ = true;
     bool isStrict_ = false;
     bool isMeasuring_ = false;
     std::vector<StepFit> fits_;

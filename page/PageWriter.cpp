@@ -51,6 +51,9 @@ bool PageWriter::writeText(View text, int style)
             text = text_.narrowView().sliced(before);
         }
     }
+    if (!text.isEmpty()) {
+        lastPieceStart_ = before;
+    }
     if (outline_.isWaiting()) {
         placeEntries(before, text);
     }
@@ -194,11 +197,16 @@ void PageWriter::writeNumberedLine(QStringView text, qsizetype marked, int lines
 
 void PageWriter::writeHeadingText()
 {
+    if (headingStarts_ != nullptr && !heading_.text.isEmpty()) {
+        headingStarts_->push_back(text_.size());
+    }
+    const qint64 piece = lastPieceStart_;
     if (isNumbered(heading_.text)) {
         write(withPageNumber(heading_.text, pageNumber_), 0);
     } else {
         write(heading_.text, 0);
     }
+    lastPieceStart_ = piece;
 }
 
 void PageWriter::writeHeading()
@@ -216,7 +224,9 @@ void PageWriter::writeHeader()
     const int lineFeeds = countLineFeeds(heading_.text);
     lineNumber_ += lineFeeds;
     lineCount_ += lineFeeds;
+    const qint64 piece = lastPieceStart_;
     write(headerLine_ + QStringLiteral("%1").arg(pageNumber_, 3), 0);
+    lastPieceStart_ = piece;
     lineFeed(qint64(heading_.linesBefore) + headerGap);
     writeHeadingText();
     lineFeed(heading_.linesAfter);

@@ -12,6 +12,7 @@
 
 #include <algorithm>
 #include <limits>
+#include <vector>
 
 namespace kareport
 {
@@ -67,6 +68,12 @@ public:
     /// Announces an entry of the outline for what is written next. @param level, text  as `OutlineEntry` has them
     void announceEntry(int level, const QString &text);
     void clearOutline() { outline_.clear(); }
+    /// Notes in a list where each heading of a page begins in the text, from now on; null ends that. The list must live until
+    /// then.
+    void noteHeadings(std::vector<qint64> *starts) { headingStarts_ = starts; }
+    /// Where the piece of text begins that was written last, other than a page header or a heading. It counts while the text
+    /// is not handed on.
+    qint64 lastPieceStart() const { return lastPieceStart_; }
     /// Exchanges the text for another one. @param lineEnds  counted as if they had been written
     void exchangeText(ReportText &text, std::vector<qint64> pageStarts, qint64 lineEnds);
     /// Replaces a piece of the text and carries the page starts along.
@@ -171,6 +178,8 @@ private:
     PageStarts starts_;
     ReportOutline outline_;
     TextOutlet *outlet_ = nullptr;
+    std::vector<qint64> *headingStarts_ = nullptr; ///< null while nobody asks for them
+    qint64 lastPieceStart_ = 0;
     quint64 losses_ = 0;
     int lineNumber_ = 0;
     qint64 lineCount_ = 0; ///< a report that is handed on may have any number

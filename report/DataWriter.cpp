@@ -3,6 +3,8 @@
 #include "GroupedTable.h"
 #include "WideVectors.h"
 
+#include <QScopeGuard>
+
 #include <algorithm>
 
 namespace kareport
@@ -15,6 +17,8 @@ namespace
 constexpr int headingRoom = 3;
 constexpr int linesOfName = 3; ///< a table's name with a blank line before and after it
 constexpr int usualHeadingLinesAfter = 2;
+/// As the heading of a table has them.
+constexpr qsizetype mostHeadingBlanks = 98;
 
 const PageHeading noHeading = {QString(), 0, usualHeadingLinesAfter};
 
@@ -40,6 +44,17 @@ DataRemarks remarksFor(const Record &record, const DataRemarks &earlier)
         remarks.columns[static_cast<std::size_t>(i)].variable = record.GetField(i).VariableName;
     }
     return remarks;
+}
+
+/// What cells say of the table or block that they are in.
+template <typename Record>
+WrittenCells::Record cellRecord(const Record &record, bool isTable, const QString &name)
+{
+    WrittenCells::Record of{isTable, name, {}};
+    for (int i = 0; i < record.GetFieldsCount(); ++i) {
+        of.variables.push_back(record.GetField(i).VariableName);
+    }
+    return of;
 }
 
 /// Counts a value by how it shows.
@@ -75,7 +90,7 @@ QString withChainageLabel(QString heading, const QString &label)
 }
 
 void DataWriter::writeBlock(const UXmlReportBlock &block, const UDataObject &object, int linesBefore, int linesAfter,
-                            DataRemarks *remarks)
+                            DataRemarks *remarks, const QString &name)
 {
     page_.skipLines(linesBefore);
     if (remarks != nullptr) {
@@ -83,6 +98,9 @@ void DataWriter::writeBlock(const UXmlReportBlock &block, const UDataObject &obj
         remarks->rows = 1;
     }
     feed_.beginBlock(block);
+    if (cells_ != nullptr) {
+        record_ = cells_->begin(cellRecord(block, false, name));
+    }
     for (int i = 0; i < block.GetFieldsCount(); ++i) {
         const sXmlReportField field = block.GetField(i);
         const FieldFormatter formatter(field);
@@ -113,6 +131,9 @@ void DataWriter::writeBlock(const UXmlReportBlock &block, const UDataObject &obj
         if (!page_.losesNothing([&] { page_.writeNumberedLine(row_.view(), field.Label.size(), 0, 1, 0); })) {
             break;
         }
+        if (cells_ != nullptr) {
+            cells_->add({page_.lastPieceStart(), static_cast<qsizetype>(row_.size()), record_, i, false});
+        }
         if (about != nullptr) {
             remarks->addWidest(*about, 0);
             remarks->setLine(page_.lineCount());
@@ -138,6 +159,12 @@ void DataWriter::writeTable(const UXmlReportTable &table, UDataObjectList &list,
     }
     const int linesAfter = layout.headingLinesAfter == -1 ? usualHeadingLinesAfter : layout.headingLinesAfter;
     page_.setHeading({withChainageLabel(table.GetHeading(), layout.chainageLabel), 0, linesAfter});
+    std::vector<qint64> headings;
+    const auto noHeadings = qScopeGuard([this] { page_.noteHeadings(nullptr); });
+    if (cells_ != nullptr) {
+        record_ = cells_->begin(cellRecord(table, true, table.GetTableName()));
+        page_.noteHeadings(&headings);
+    }
     auto *groups = dynamic_cast<GroupedList *>(&list);
     const bool isGrouped = groups != nullptr && !groups->groups().isEmpty();
     if (!isGrouped) {
@@ -153,6 +180,9 @@ void DataWriter::writeTable(const UXmlReportTable &table, UDataObjectList &list,
         writeRows(table, list, remarks);
     }
     feed_.endTable();
+    if (cells_ != nullptr) {
+        addHeadingCells(table, layout.chainageLabel, headings);
+    }
     endOutput(layout.linesAfter);
 }
 
@@ -198,12 +228,14 @@ void DataWriter::writeRows(const UXmlReportTable &table, UDataObjectList &list, 
         object = list.GetAt(index);
         if (object != nullptr) {
             page_.writeLine(row_.view(), 0, 1, 0);
+            addCells(rowCells_, page_.lastPieceStart());
             remarks.setLine(page_.lineCount());
             continue;
         }
         // The last line end may turn the page: without a heading it does not begin with one over no rows.
         page_.newPage(0);
         page_.write(row_.view(), 0);
+        addCells(rowCells_, page_.lastPieceStart());
         page_.noteChange();
         page_.setHeading(noHeading);
         page_.writeLine(QStringView(), 0, 1, 0);
@@ -231,9 +263,20 @@ void DataWriter::writeGroups(const UXmlReportTable &table, UDataObjectList &list
     grouped.write({list,
                    [&](const UDataObject &object, quint64 row) {
                        formatRow(fields, object, row, remarks);
+                       if (cells_ != nullptr) {
+                           waitingCells_.emplace_back(row + 1, rowCells_);
+                       }
                        return row_.view();
                    },
-                   placeOnce});
+                   placeOnce,
+                   [&](quint64 row) {
+                       while (!waitingCells_.empty() && waitingCells_.front().first <= row) {
+                           if (waitingCells_.front().first == row) {
+                               addCells(waitingCells_.front().second, page_.lastPieceStart());
+                           }
+                           waitingCells_.pop_front();
+                       }
+                   }});
     if (!isPlaced) {
         placeOnce(0);
     }
@@ -244,14 +287,25 @@ void DataWriter::formatRow(const std::vector<FieldFormatter> &fields, const UDat
 {
     endWideVectors();
     row_.clear();
+    rowCells_.clear();
     QStringView suffix;
     auto column = remarks.columns.begin();
     for (const FieldFormatter &field : fields) {
         ColumnRemarks &about = *column++;
+        const std::size_t begin = row_.size();
+        const auto noteCell = [&] {
+            if (cells_ != nullptr) {
+                rowCells_.push_back({static_cast<qint64>(begin), static_cast<qsizetype>(row_.size() - begin), record_,
+                                     static_cast<int>(&field - fields.data()), false});
+            }
+        };
         switch (field.marker()) {
         case FieldMarker::SuffixR: suffix = u"R"; continue;
         case FieldMarker::SuffixPlus: suffix = u"+"; continue;
-        case FieldMarker::Filler: field.append(row_, options_, ValueKind::None, nullptr, suffix); break;
+        case FieldMarker::Filler:
+            field.append(row_, options_, ValueKind::None, nullptr, suffix);
+            noteCell();
+            break;
         case FieldMarker::None: {
             const UDictEntry *entry = object.Find(field.id());
             WidestText *const widest = remarks.measures ? &about.widest : nullptr;
@@ -272,6 +326,7 @@ void DataWriter::formatRow(const std::vector<FieldFormatter> &fields, const UDat
             if (about.widest.width != widestBefore) {
                 remarks.addWidest(about, row);
             }
+            noteCell();
             row_.append(options_.separator);
             break;
         }
@@ -280,6 +335,41 @@ void DataWriter::formatRow(const std::vector<FieldFormatter> &fields, const UDat
     }
     if (row_.size() > 0 && row_.view().back() == QChar(options_.separator)) {
         row_.truncate(row_.size() - 1);
+    }
+}
+
+/// Notes where the cells of a line are. @param start  of the line in the text
+void DataWriter::addCells(const std::vector<WrittenCell> &line, qint64 start)
+{
+    for (WrittenCell cell : line) { // none where nobody wants them
+        cell.at += start;
+        cells_->add(cell);
+    }
+}
+
+/// Notes where the labels are in the headings of a table that were written.
+void DataWriter::addHeadingCells(const UXmlReportTable &table, const QString &chainageLabel,
+                                 const std::vector<qint64> &starts)
+{
+    const QString heading = table.GetHeading();
+    const QString word = chainageWordOf(heading);
+    const bool fills = table.GetColumnSeparator() != u"\t";
+    std::vector<WrittenCell> labels;
+    qsizetype at = 0;      // in the heading of the template
+    qsizetype shownAt = 0; // in the one that is shown
+    for (int i = 0; i < table.GetFieldsCount(); ++i) {
+        const sXmlReportField field = table.GetField(i);
+        const qsizetype blanks =
+            fills ? std::clamp<qsizetype>(field.Width - field.Label.size(), 0, mostHeadingBlanks) : 0;
+        const QString piece = heading.mid(at, field.Label.size() + blanks);
+        const qsizetype shown = QString(piece).replace(word, chainageLabel).size();
+        const qsizetype separator = fieldMarker(field.VariableName) == FieldMarker::None ? 1 : 0;
+        labels.push_back({shownAt, shown, record_, i, true});
+        at += piece.size() + separator;
+        shownAt += shown + separator;
+    }
+    for (const qint64 start : starts) {
+        addCells(labels, start);
     }
 }
 

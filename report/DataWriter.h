@@ -8,8 +8,13 @@
 #include "UDataObjectList.h"
 #include "UXmlReportBlock.h"
 #include "UXmlReportTable.h"
+#include "WrittenCells.h"
 
 #include <QString>
+
+#include <deque>
+#include <utility>
+#include <vector>
 
 namespace kareport
 {
@@ -19,13 +24,16 @@ class DataWriter
 {
 public:
     /// @param results  receives the values that are written; may be null
-    DataWriter(PageWriter &page, const FormatOptions &options, ResultSink *results = nullptr)
-        : page_(page), options_(options), feed_(results, options)
+    /// @param cells    receives where they are shown; may be null
+    DataWriter(PageWriter &page, const FormatOptions &options, ResultSink *results = nullptr,
+               WrittenCells *cells = nullptr)
+        : page_(page), options_(options), feed_(results, options), cells_(cells)
     {}
 
     /// @param remarks  receives what the block does not show as it is; may be null
+    /// @param name     of the block, for its cells
     void writeBlock(const UXmlReportBlock &block, const UDataObject &object, int linesBefore, int linesAfter,
-                    DataRemarks *remarks = nullptr);
+                    DataRemarks *remarks = nullptr, const QString &name = QString());
 
     struct TableLayout
     {
@@ -46,11 +54,17 @@ private:
     void formatRow(const std::vector<FieldFormatter> &fields, const UDataObject &object, quint64 row,
                    DataRemarks &remarks);
     void endOutput(int linesAfter);
+    void addCells(const std::vector<WrittenCell> &line, qint64 start);
+    void addHeadingCells(const UXmlReportTable &table, const QString &chainageLabel, const std::vector<qint64> &starts);
 
     PageWriter &page_;
     const FormatOptions &options_;
     TextBuffer row_;
     ResultFeed feed_;
+    WrittenCells *cells_;               ///< null where nobody wants them
+    int record_ = 0;                    ///< of the cells
+    std::vector<WrittenCell> rowCells_; ///< of the row that was formatted last, by their places in it
+    std::deque<std::pair<quint64, std::vector<WrittenCell>>> waitingCells_; ///< of rows, from 1, without a place
 };
 
 /// The word of a table's heading that the chainage column's own label replaces: "Chainage" or, where there is none, "Station".

@@ -60,7 +60,11 @@ GroupedTable::GroupedTable(PageWriter &page, const FormatOptions &options, const
 
 void GroupedTable::write(const Rows &rows)
 {
-    lines_.setHooks({rows.placeHeading, [this](const KeptLines::Line &line) { countPageRow(line); },
+    lines_.setHooks({rows.placeHeading,
+                     [this, &rows](const KeptLines::Line &line) {
+                         rows.rowWritten(line.row);
+                         countPageRow(line);
+                     },
                      [this] { return pageEnd(); }, [this] { clearPage(); }},
                     pageEndHeight());
     const std::size_t levels = groups_.levels.size();

@@ -33,6 +33,8 @@ public:
         std::function<QStringView(const UDataObject &object, quint64 row)> textOf;
         /// Places the table's heading over so many lines that belong together.
         std::function<void(qint64 lines)> placeHeading;
+        /// Is told that a row was written. @param row  from 1
+        std::function<void(quint64 row)> rowWritten;
     };
 
     GroupedTable(PageWriter &page, const FormatOptions &options, const UXmlReportTable &table, GroupedList &groups,

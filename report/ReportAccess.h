@@ -7,6 +7,7 @@ namespace kareport
 
 class Placeholders;
 class ResultSink;
+class WrittenCells;
 struct DataRemarks;
 struct LoadedText;
 
@@ -17,6 +18,7 @@ struct ReportHooks
     DataRemarks *remarks =
         nullptr; ///< receives what the table or block written last does not show as it is; may be null
     ResultSink *results = nullptr; ///< receives the values of tables and blocks while they are written; may be null
+    WrittenCells *cells = nullptr; ///< receives where the fields are shown; may be null
 };
 
 /// What the programs of this project do with a report and a host does not: it cannot make what the functions take.

@@ -80,6 +80,7 @@ bool ReportTemplate::loadBlock(const QString &name)
     if (!block->LoadBlock(name, template_.get())) {
         return false;
     }
+    blockName_ = name;
     block_ = std::move(block);
     return true;
 }

@@ -47,6 +47,8 @@ public:
     const UXmlReportTpl *loaded() const { return template_.get(); }
     const UXmlReportTable *table() const { return table_.get(); }
     const UXmlReportBlock *block() const { return block_.get(); }
+    /// The name that the block was loaded by.
+    const QString &blockName() const { return blockName_; }
 
     /// How values become texts. It points into this object.
     FormatOptions formatOptions() const { return {&settings, separator, zeroBlank, ownPrintHash.value_or(printHash)}; }
@@ -55,6 +57,7 @@ private:
     std::unique_ptr<UXmlReportTpl> template_;
     std::unique_ptr<UXmlReportTable> table_; ///< a handle into the template, as the block is
     std::unique_ptr<UXmlReportBlock> block_;
+    QString blockName_;
 };
 
 /// Where a template file of a name may be, in the order that counts: in the library folder and in the start folder.

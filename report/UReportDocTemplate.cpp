@@ -83,8 +83,8 @@ bool UReportDoc::WriteDataBlock(const UDataObject *object, int linesBefore, int 
     }
     return writeData(parts_->page, [&] {
         const kareport::FormatOptions options = parts_->data.formatOptions();
-        kareport::DataWriter(parts_->page, options, parts_->data.results)
-            .writeBlock(*block, *object, linesBefore, linesAfter, parts_->data.remarks);
+        kareport::DataWriter(parts_->page, options, parts_->data.results, parts_->hooks.cells)
+            .writeBlock(*block, *object, linesBefore, linesAfter, parts_->data.remarks, parts_->data.blockName());
     });
 }
 
@@ -101,7 +101,7 @@ bool UReportDoc::WriteDataTable(UDataObjectList *list, int linesBefore, int line
     }
     return writeData(parts_->page, [&] {
         const kareport::FormatOptions options = parts_->data.formatOptions();
-        kareport::DataWriter(parts_->page, options, parts_->data.results)
+        kareport::DataWriter(parts_->page, options, parts_->data.results, parts_->hooks.cells)
             .writeTable(*table, *list,
                         {linesBefore, linesAfter, headingLinesAfter, parts_->chainageLabel, parts_->writeTableName,
                          parts_->data.remarks});

@@ -7,6 +7,7 @@
 #include "PageHeader.h"
 #include "ReportParts.h"
 #include "ReportTextCodec.h"
+#include "WrittenCells.h"
 #include "Xlate.h"
 
 #include <algorithm>
@@ -97,6 +98,9 @@ void UReportDoc::Clear()
     parts_->page.clear();
     parts_->mirrors.image.clear();
     parts_->openedFromRtf = false;
+    if (parts_->hooks.cells != nullptr) {
+        parts_->hooks.cells->clear();
+    }
 }
 
 int UReportDoc::CheckSize(int required)

@@ -60,7 +60,7 @@ void assignUtf8(QString &target, std::string_view text)
 } // namespace
 
 ValueParser::ValueParser(int type, unsigned id, const DataUnits &units)
-    : form_(Form::Number), id_(id), factor_(units.factorOf(type)), quarter_(quarterOf(units.angle))
+    : form_(Form::Number), type_(type), id_(id), factor_(units.factorOf(type)), quarter_(quarterOf(units.angle))
 {
     switch (type) {
     case VARIABLE_INTEGER: form_ = Form::Whole; break;

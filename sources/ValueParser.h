@@ -21,6 +21,8 @@ public:
     ValueParser(int type, unsigned id, const DataUnits &units);
 
     unsigned id() const { return id_; }
+    /// The value type code that it was made with.
+    int type() const { return type_; }
 
     /// Says how the numbers of the texts are written. Angles have no thousands.
     void setNumberStyle(const NumberStyle &style);
@@ -75,6 +77,7 @@ private:
     bool storeDigits(Integer number, UDictionary &object) const;
 
     Form form_;
+    int type_;
     unsigned id_;
     double factor_;
     double quarter_;      ///< of a circle in the unit of the data's numbers
