@@ -2617,6 +2617,71 @@
         <translation>%1 wurde erwartet, wie die Variable „%2“ es hat</translation>
     </message>
     <message>
+        <location filename="../preview/TemplateEdits.cpp"/>
+        <source>A name without blanks at its ends was expected.</source>
+        <translation>Ein Name ohne Leerzeichen an seinen Enden wurde erwartet.</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateEdits.cpp"/>
+        <source>A name without &lt; and &gt; was expected.</source>
+        <translation>Ein Name ohne &lt; und &gt; wurde erwartet.</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateEdits.cpp"/>
+        <source>"%1" is no variable: it has a meaning of its own.</source>
+        <translation>„%1“ ist keine Variable: der Name hat eine eigene Bedeutung.</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateEdits.cpp"/>
+        <source>There is a variable "%1" already.</source>
+        <translation>Es gibt schon eine Variable „%1“.</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateEdits.cpp"/>
+        <source>A field belongs to a table or a block: put the cursor into one.</source>
+        <translation>Ein Feld gehört in eine Tabelle oder einen Block: setzen Sie die Schreibmarke dorthin.</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateEdits.cpp"/>
+        <source>The table or block needs a name first.</source>
+        <translation>Die Tabelle oder der Block braucht zuerst einen Namen.</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateEdits.cpp"/>
+        <source>The template cannot be read: mend what the list of remarks says first.</source>
+        <translation>Die Vorlage kann nicht gelesen werden: beheben Sie zuerst, was in der Liste der Anmerkungen steht.</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateEdits.cpp"/>
+        <source>Put the cursor on a variable first: in a field, a sort key or a dictionary.</source>
+        <translation>Setzen Sie die Schreibmarke zuerst auf eine Variable: in einem Feld, einem Sortierschlüssel oder einem Wörterbuch.</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplatePreview.cpp"/>
+        <source>a job with this template was expected</source>
+        <translation>ein Auftrag mit dieser Vorlage wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplatePreview.cpp"/>
+        <source>a job with this template was expected: it has "%1"</source>
+        <translation>ein Auftrag mit dieser Vorlage wurde erwartet: er hat „%1“</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplatePreview.cpp"/>
+        <source>a window has no standard input: a file was expected</source>
+        <translation>ein Fenster hat keine Standardeingabe: eine Datei wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplatePreview.cpp"/>
+        <source>the template file cannot be written for its preview: %1</source>
+        <translation>die Vorlagendatei kann für ihre Vorschau nicht geschrieben werden: %1</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplatePreview.cpp"/>
+        <source>There is not enough memory for this input.</source>
+        <translation>Der Arbeitsspeicher reicht für diese Eingabe nicht aus.</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/CheckCommand.cpp"/>
         <source>there is not enough memory for this file</source>
         <translation>der Speicher reicht für diese Datei nicht aus</translation>
@@ -3291,11 +3356,6 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
-        <source>a window has no standard input: a file was expected</source>
-        <translation>ein Fenster hat keine Standardeingabe: eine Datei wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
         <source>it is a folder, a pipe or a device</source>
         <translation>das ist ein Ordner, eine Pipe oder ein Gerät</translation>
     </message>
@@ -3308,11 +3368,6 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
         <source>Another job is running. Wait until it has finished, or cancel it.</source>
         <translation>Ein anderer Auftrag läuft gerade. Sein Ende abwarten oder ihn abbrechen.</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
-        <source>There is not enough memory for this input.</source>
-        <translation>Der Arbeitsspeicher reicht für diese Eingabe nicht aus.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/KeptReport.cpp"/>
@@ -3625,6 +3680,11 @@ Sollen sie wieder geöffnet werden?</translation>
         <translation>Daten (*.csv *.txt *.xml *.landxml);;Alle Dateien (*)</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>&amp;Edit Template</source>
+        <translation>Vorlage &amp;bearbeiten</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/TemplateDialogFiles.cpp"/>
         <source>The data file was not read to its end.</source>
         <translation>Die Datendatei wurde nicht zu Ende gelesen.</translation>
@@ -3923,6 +3983,241 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/main.cpp"/>
         <source>Jobs (.json), saved reports (.rep, .rtf) and templates (.xml) to open</source>
         <translation>Zu öffnende Aufträge (.json), gespeicherte Berichte (.rep, .rtf) und Vorlagen (.xml)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
+        <source>Find and replace</source>
+        <translation>Suchen und ersetzen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
+        <source>Text to put in its place</source>
+        <translation>Text, der an seine Stelle kommt</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
+        <source>Replace with</source>
+        <translation>Ersetzen durch</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
+        <source>&amp;Next</source>
+        <translation>&amp;Nächster</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
+        <source>&amp;Previous</source>
+        <translation>&amp;Voriger</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
+        <source>&amp;Replace</source>
+        <translation>&amp;Ersetzen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
+        <source>Replace &amp;All</source>
+        <translation>&amp;Alle ersetzen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
+        <source>Matches: %1</source>
+        <translation>Treffer: %1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplatePage.cpp"/>
+        <source>First pages of the report</source>
+        <translation>Erste Seiten des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplatePage.cpp"/>
+        <source>Enter on a value or a label goes to its field in the template.</source>
+        <translation>Die Eingabetaste auf einem Wert oder einer Beschriftung führt zu ihrem Feld in der Vorlage.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateTextEdit.cpp"/>
+        <source>Text of the template</source>
+        <translation>Text der Vorlage</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateTextEdit.cpp"/>
+        <source>What can be written here</source>
+        <translation>Was hier stehen kann</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindow.cpp"/>
+        <source>Working…</source>
+        <translation>In Arbeit …</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindow.cpp"/>
+        <source>Rows that are made up are shown: %1</source>
+        <translation>Erfundene Zeilen werden gezeigt: %1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindow.cpp"/>
+        <source>The last pages that could be made are shown: %1</source>
+        <translation>Die letzten Seiten, die gemacht werden konnten, werden gezeigt: %1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindow.cpp"/>
+        <source>error</source>
+        <translation>Fehler</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindow.cpp"/>
+        <source>warning</source>
+        <translation>Warnung</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindow.cpp"/>
+        <source>Line %1, column %2</source>
+        <translation>Zeile %1, Spalte %2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowFile.cpp"/>
+        <source>"%1" has characters that cannot be shown here. It can be read, but not edited.</source>
+        <translation>„%1“ hat Zeichen, die hier nicht gezeigt werden können. Die Datei kann gelesen, aber nicht bearbeitet werden.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowFile.cpp"/>
+        <source>"%1" could not be saved: %2</source>
+        <translation>„%1“ konnte nicht gespeichert werden: %2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowFile.cpp"/>
+        <source>"%1" has characters that are not in Latin-1. It was saved as UTF-8.</source>
+        <translation>„%1“ hat Zeichen, die es in Latin-1 nicht gibt. Die Datei wurde als UTF-8 gespeichert.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowFile.cpp"/>
+        <source>Rows that are made up</source>
+        <translation>Erfundene Zeilen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowFile.cpp"/>
+        <source>Choose a job or a data file...</source>
+        <translation>Auftrag oder Datendatei wählen ...</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Rename Variable</source>
+        <translation>Variable umbenennen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>New name</source>
+        <translation>Neuer Name</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;New name of "%1":</source>
+        <translation>&amp;Neuer Name von „%1“:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Choose a job or a data file</source>
+        <translation>Auftrag oder Datendatei wählen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Jobs and data (*.json *.csv *.txt)</source>
+        <translation>Aufträge und Daten (*.json *.csv *.txt)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Remarks on the template</source>
+        <translation>Anmerkungen zur Vorlage</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Kind</source>
+        <translation>Art</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Remark</source>
+        <translation>Anmerkung</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Data of the pages</source>
+        <translation>Daten der Seiten</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>State of the pages</source>
+        <translation>Stand der Seiten</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Save &amp;As...	Ctrl+Shift+S</source>
+        <translation>Speichern &amp;unter ...	Ctrl+Shift+S</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Choose &amp;Data...	Ctrl+D</source>
+        <translation>&amp;Daten wählen ...	Ctrl+D</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;Close	Ctrl+W</source>
+        <translation>S&amp;chließen	Ctrl+W</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;Find and Replace...	Ctrl+F</source>
+        <translation>&amp;Suchen und Ersetzen ...	Ctrl+F</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>C&amp;omplete	Ctrl+Space</source>
+        <translation>&amp;Vervollständigen	Ctrl+Space</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Rena&amp;me Variable...	F2</source>
+        <translation>Variable &amp;umbenennen ...	F2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;Insert</source>
+        <translation>&amp;Einfügen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;Field	Ctrl+Shift+F</source>
+        <translation>&amp;Feld	Ctrl+Shift+F</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;Table	Ctrl+Shift+T</source>
+        <translation>&amp;Tabelle	Ctrl+Shift+T</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;Block	Ctrl+Shift+B</source>
+        <translation>&amp;Block	Ctrl+Shift+B</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;Dictionary	Ctrl+Shift+D</source>
+        <translation>&amp;Wörterbuch	Ctrl+Shift+D</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;Next Remark	F8</source>
+        <translation>&amp;Nächste Anmerkung	F8</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;Previous Remark	Shift+F8</source>
+        <translation>&amp;Vorige Anmerkung	Shift+F8</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Text, &amp;Pages, Remarks	F6</source>
+        <translation>Text, &amp;Seiten, Anmerkungen	F6</translation>
     </message>
 </context>
 </TS>

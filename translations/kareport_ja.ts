@@ -2617,6 +2617,71 @@
         <translation>%1が必要です (変数「%2」の値として)</translation>
     </message>
     <message>
+        <location filename="../preview/TemplateEdits.cpp"/>
+        <source>A name without blanks at its ends was expected.</source>
+        <translation>前後に空白のない名前が必要です。</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateEdits.cpp"/>
+        <source>A name without &lt; and &gt; was expected.</source>
+        <translation>&lt; と &gt; を含まない名前が必要です。</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateEdits.cpp"/>
+        <source>"%1" is no variable: it has a meaning of its own.</source>
+        <translation>"%1" は変数ではありません。特別な意味を持つ名前です。</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateEdits.cpp"/>
+        <source>There is a variable "%1" already.</source>
+        <translation>変数 "%1" は既にあります。</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateEdits.cpp"/>
+        <source>A field belongs to a table or a block: put the cursor into one.</source>
+        <translation>フィールドは表またはブロックに属します。その中にカーソルを置いてください。</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateEdits.cpp"/>
+        <source>The table or block needs a name first.</source>
+        <translation>先に表またはブロックに名前を付けてください。</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateEdits.cpp"/>
+        <source>The template cannot be read: mend what the list of remarks says first.</source>
+        <translation>テンプレートを読み取れません。先に指摘の一覧の内容を直してください。</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateEdits.cpp"/>
+        <source>Put the cursor on a variable first: in a field, a sort key or a dictionary.</source>
+        <translation>先に、フィールド、並べ替えキーまたは辞書の変数にカーソルを置いてください。</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplatePreview.cpp"/>
+        <source>a job with this template was expected</source>
+        <translation>このテンプレートを使うジョブが必要です</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplatePreview.cpp"/>
+        <source>a job with this template was expected: it has "%1"</source>
+        <translation>このテンプレートを使うジョブが必要ですが、"%1" が指定されています</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplatePreview.cpp"/>
+        <source>a window has no standard input: a file was expected</source>
+        <translation>ウィンドウには標準入力がありません: ファイルが必要です</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplatePreview.cpp"/>
+        <source>the template file cannot be written for its preview: %1</source>
+        <translation>プレビューのためにテンプレートファイルを書き込めません: %1</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplatePreview.cpp"/>
+        <source>There is not enough memory for this input.</source>
+        <translation>この入力を処理するメモリが足りません。</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport/CheckCommand.cpp"/>
         <source>there is not enough memory for this file</source>
         <translation>このファイルにはメモリが足りません</translation>
@@ -3291,11 +3356,6 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
-        <source>a window has no standard input: a file was expected</source>
-        <translation>ウィンドウには標準入力がありません: ファイルが必要です</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
         <source>it is a folder, a pipe or a device</source>
         <translation>フォルダー、パイプ、またはデバイスです</translation>
     </message>
@@ -3308,11 +3368,6 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
         <source>Another job is running. Wait until it has finished, or cancel it.</source>
         <translation>別のジョブが実行中です。終了を待つか、中止してください。</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
-        <source>There is not enough memory for this input.</source>
-        <translation>この入力を処理するメモリが足りません。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/KeptReport.cpp"/>
@@ -3625,6 +3680,11 @@ Open them again?</source>
         <translation>データ (*.csv *.txt *.xml *.landxml);;すべてのファイル (*)</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>&amp;Edit Template</source>
+        <translation>テンプレートを編集(&amp;E)</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/TemplateDialogFiles.cpp"/>
         <source>The data file was not read to its end.</source>
         <translation>データファイルは最後まで読み込まれませんでした。</translation>
@@ -3923,6 +3983,241 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/main.cpp"/>
         <source>Jobs (.json), saved reports (.rep, .rtf) and templates (.xml) to open</source>
         <translation>開くジョブ (.json)、保存した帳票 (.rep, .rtf)、テンプレート (.xml)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
+        <source>Find and replace</source>
+        <translation>検索と置換</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
+        <source>Text to put in its place</source>
+        <translation>置き換える文字列</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
+        <source>Replace with</source>
+        <translation>置換後の文字列</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
+        <source>&amp;Next</source>
+        <translation>次へ(&amp;N)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
+        <source>&amp;Previous</source>
+        <translation>前へ(&amp;P)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
+        <source>&amp;Replace</source>
+        <translation>置換(&amp;R)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
+        <source>Replace &amp;All</source>
+        <translation>すべて置換(&amp;A)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
+        <source>Matches: %1</source>
+        <translation>一致: %1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplatePage.cpp"/>
+        <source>First pages of the report</source>
+        <translation>レポートの先頭ページ</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplatePage.cpp"/>
+        <source>Enter on a value or a label goes to its field in the template.</source>
+        <translation>値または見出しの上で Enter を押すと、テンプレートのフィールドに移動します。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateTextEdit.cpp"/>
+        <source>Text of the template</source>
+        <translation>テンプレートのテキスト</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateTextEdit.cpp"/>
+        <source>What can be written here</source>
+        <translation>ここに書けるもの</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindow.cpp"/>
+        <source>Working…</source>
+        <translation>処理中…</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindow.cpp"/>
+        <source>Rows that are made up are shown: %1</source>
+        <translation>仮の行を表示しています: %1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindow.cpp"/>
+        <source>The last pages that could be made are shown: %1</source>
+        <translation>最後に作成できたページを表示しています: %1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindow.cpp"/>
+        <source>error</source>
+        <translation>エラー</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindow.cpp"/>
+        <source>warning</source>
+        <translation>警告</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindow.cpp"/>
+        <source>Line %1, column %2</source>
+        <translation>%1 行 %2 列</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowFile.cpp"/>
+        <source>"%1" has characters that cannot be shown here. It can be read, but not edited.</source>
+        <translation>"%1" にはここに表示できない文字があります。読むことはできますが、編集はできません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowFile.cpp"/>
+        <source>"%1" could not be saved: %2</source>
+        <translation>"%1" を保存できませんでした: %2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowFile.cpp"/>
+        <source>"%1" has characters that are not in Latin-1. It was saved as UTF-8.</source>
+        <translation>"%1" には Latin-1 にない文字があります。UTF-8 で保存しました。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowFile.cpp"/>
+        <source>Rows that are made up</source>
+        <translation>仮の行</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowFile.cpp"/>
+        <source>Choose a job or a data file...</source>
+        <translation>ジョブまたはデータファイルを選択...</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Rename Variable</source>
+        <translation>変数名の変更</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>New name</source>
+        <translation>新しい名前</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;New name of "%1":</source>
+        <translation>"%1" の新しい名前(&amp;N):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Choose a job or a data file</source>
+        <translation>ジョブまたはデータファイルの選択</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Jobs and data (*.json *.csv *.txt)</source>
+        <translation>ジョブとデータ (*.json *.csv *.txt)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Remarks on the template</source>
+        <translation>テンプレートへの指摘</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Kind</source>
+        <translation>種類</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Remark</source>
+        <translation>指摘</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Data of the pages</source>
+        <translation>ページのデータ</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>State of the pages</source>
+        <translation>ページの状態</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Save &amp;As...	Ctrl+Shift+S</source>
+        <translation>名前を付けて保存(&amp;A)...	Ctrl+Shift+S</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Choose &amp;Data...	Ctrl+D</source>
+        <translation>データを選択(&amp;D)...	Ctrl+D</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;Close	Ctrl+W</source>
+        <translation>閉じる(&amp;C)	Ctrl+W</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;Find and Replace...	Ctrl+F</source>
+        <translation>検索と置換(&amp;F)...	Ctrl+F</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>C&amp;omplete	Ctrl+Space</source>
+        <translation>補完(&amp;O)	Ctrl+Space</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Rena&amp;me Variable...	F2</source>
+        <translation>変数名の変更(&amp;M)...	F2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;Insert</source>
+        <translation>挿入(&amp;I)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;Field	Ctrl+Shift+F</source>
+        <translation>フィールド(&amp;F)	Ctrl+Shift+F</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;Table	Ctrl+Shift+T</source>
+        <translation>表(&amp;T)	Ctrl+Shift+T</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;Block	Ctrl+Shift+B</source>
+        <translation>ブロック(&amp;B)	Ctrl+Shift+B</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;Dictionary	Ctrl+Shift+D</source>
+        <translation>辞書(&amp;D)	Ctrl+Shift+D</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;Next Remark	F8</source>
+        <translation>次の指摘(&amp;N)	F8</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>&amp;Previous Remark	Shift+F8</source>
+        <translation>前の指摘(&amp;P)	Shift+F8</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <source>Text, &amp;Pages, Remarks	F6</source>
+        <translation>テキスト、ページ、指摘(&amp;P)	F6</translation>
     </message>
 </context>
 </TS>

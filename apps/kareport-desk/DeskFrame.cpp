@@ -3,6 +3,7 @@
 #include "AppMessageBox.h"
 #include "Folders.h"
 #include "JobLauncher.h"
+#include "OpenTemplate.h"
 #include "PreferencesDialog.h"
 #include "ReportEntry.h"
 #include "ReportResources.h"
@@ -24,6 +25,7 @@
 DeskFrame::DeskFrame() : files_([this](const QString &path) { fileChanged(path); })
 {
     commands_ = makeCommands();
+    kareport::setFileOpener([this](const QString &path) { return OpenFile(path); });
     setWindowTitle(Xlate(kareport::reportString(kareport::moduleTitle)));
     setAcceptDrops(true);
     constexpr QSize usualSize(1000, 760);
@@ -61,7 +63,11 @@ DeskFrame::DeskFrame() : files_([this](const QString &path) { fileChanged(path);
     recoveryTimer->start(recoveryInterval);
 }
 
-DeskFrame::~DeskFrame() = default;
+DeskFrame::~DeskFrame()
+{
+    kareport::dropTemplateEditors();
+    kareport::setFileOpener({});
+}
 
 void DeskFrame::newReport()
 {
@@ -105,6 +111,11 @@ void DeskFrame::about()
 void DeskFrame::closeEvent(QCloseEvent *event)
 {
     if (kareport::isJobRunning()) {
+        event->ignore();
+        kareport::noteExitCancelled();
+        return;
+    }
+    if (!kareport::closeTemplateEditors()) {
         event->ignore();
         kareport::noteExitCancelled();
         return;

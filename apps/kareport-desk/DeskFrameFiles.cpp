@@ -4,6 +4,8 @@
 #include "FileKind.h"
 #include "Folders.h"
 #include "JobLauncher.h"
+#include "LandXmlContents.h"
+#include "OpenTemplate.h"
 #include "ReportSaveName.h"
 #include "SavedReports.h"
 #include "UApplication.h"
@@ -34,6 +36,14 @@ UDocument *documentOf(const QString &path, const UDocument *except = nullptr)
         }
     }
     return nullptr;
+}
+
+/// Whether a file is data that a report is made of, and no template.
+bool holdsLandXml(const QString &path)
+{
+    const auto file = kareport::FileBytes::open(path);
+    const auto *opened = std::get_if<std::shared_ptr<const kareport::FileBytes>>(&file);
+    return opened != nullptr && kareport::isLandXml(*opened);
 }
 
 /// Says how many notes there are on a report that was made, and the first of them.
@@ -134,6 +144,9 @@ bool DeskFrame::OpenFile(const QString &path)
     }
     const auto kind = kareport::fileKindOf(path);
     if (kind == kareport::FileKind::Template) {
+        if (!holdsLandXml(path)) {
+            return kareport::openTemplateAt(path);
+        }
         fromTemplate(path);
         return true;
     }

@@ -1,6 +1,7 @@
 #include "TemplateDialog.h"
 
 #include "Folders.h"
+#include "OpenTemplate.h"
 #include "PlainWidgets.h"
 #include "Profile.h"
 #include "Xlate.h"
@@ -88,6 +89,12 @@ TemplateDialog::TemplateDialog(QWidget *parent)
     connect(file_, &QLineEdit::textChanged, this, &TemplateDialog::readTemplates);
     connect(template_, &QComboBox::currentIndexChanged, this, &TemplateDialog::readOutputs);
     connect(data_, &QLineEdit::textChanged, this, &TemplateDialog::readData);
+    edit_ = buttons_->addButton(Xlate("&Edit Template"), QDialogButtonBox::ActionRole);
+    connect(edit_, &QPushButton::clicked, this, [this] {
+        const QString path = file_->text();
+        reject();
+        openTemplateAt(path);
+    });
     connect(buttons_, &QDialogButtonBox::accepted, this, &TemplateDialog::accept);
     connect(buttons_, &QDialogButtonBox::rejected, this, &TemplateDialog::reject);
 

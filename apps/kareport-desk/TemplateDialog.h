@@ -12,6 +12,7 @@ class QComboBox;
 class QDialogButtonBox;
 class QLabel;
 class QLineEdit;
+class QPushButton;
 
 namespace kareport
 {
@@ -48,6 +49,7 @@ private:
     QString wrong_;     ///< with the template file
     QString wrongData_; ///< with the data file
     QDialogButtonBox *buttons_;
+    QPushButton *edit_ = nullptr; ///< opens the template in its editor
 };
 
 } // namespace kareport

@@ -130,6 +130,9 @@ void TemplateDialog::check()
         message[0] = message[0].toUpper(); // the error of a file is the end of a sentence
     }
     message_->setText(message);
+    if (edit_ != nullptr) {
+        edit_->setEnabled(QFileInfo(file_->text()).isFile());
+    }
     buttons_->button(QDialogButtonBox::Ok)
         ->setEnabled(message.isEmpty() && output_->currentIndex() >= 0 && !data_->text().isEmpty());
 }

@@ -6,9 +6,12 @@
 #include "DeskCommandIds.h"
 #include "DeskFrame.h"
 #include "DeskPreferences.h"
+#include "OpenTemplate.h"
 #include "PaneDock.h"
 #include "ReportEdit.h"
 #include "ReportResources.h"
+#include "TemplateTextEdit.h"
+#include "TemplateWindow.h"
 #include "UReportDoc.h"
 #include "UReportView.h"
 #include "UReportWindowDlg.h"
@@ -387,6 +390,41 @@ void failEditor(World &world, Chance & /*chance*/)
     kareport::savePreferences(preferences);
 }
 
+/// Works in the editor of a template, which may stay open.
+void editTemplate(World &world, Chance &chance)
+{
+    static const QStringList pieces = {QStringLiteral("<"),     QStringLiteral("</Field>"), QStringLiteral("x"),
+                                       QStringLiteral("RIGHT"), QStringLiteral("<Field>"),  QStringLiteral("\n")};
+    const QString path = world.folder().filePath(QStringLiteral("edited.xml"));
+    if (QFile file(path); !file.exists() && file.open(QIODevice::WriteOnly)) {
+        file.write("<ReportTemplate>\n\t<Name>T</Name>\n\t<Title>Title</Title>\n</ReportTemplate>\n");
+    }
+    kareport::openTemplateAt(path);
+    for (QWidget *widget : QApplication::topLevelWidgets()) {
+        auto *window = dynamic_cast<kareport::TemplateWindow *>(widget);
+        if (window == nullptr || !window->isVisible()) {
+            continue;
+        }
+        for (int step = 0; step < 4; ++step) {
+            const int place = chance.below(window->edit().document()->characterCount());
+            window->edit().select({place, place});
+            QTest::keyClicks(&window->edit(), pieces.at(chance.below(pieces.size())));
+            QList<QAction *> actions;
+            for (QAction *menu : window->menuBar()->actions().mid(1)) { // files are asked for in the first one
+                collect(*menu->menu(), actions);
+            }
+            QAction *action = chance.of(actions);
+            world.did += action->text() + u' ';
+            action->trigger();
+            QCoreApplication::processEvents();
+        }
+        if (chance.oneIn(2)) {
+            window->close();
+        }
+        return;
+    }
+}
+
 } // namespace
 
 const std::vector<Action> &allActions()
@@ -416,6 +454,7 @@ const std::vector<Action> &allActions()
         {"keep", 6, false, keep},
         {"exit", 2, false, exitDesk},
         {"crash", 1, false, crash},
+        {"template", 1, false, editTemplate},
         {"fail-files", 2, true, failFiles},
         {"fail-printer", 1, true, failPrinter},
         {"fail-editor", 1, true, failEditor},

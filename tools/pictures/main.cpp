@@ -3,6 +3,7 @@
 #include "DeskCommandIds.h"
 #include "DeskFrame.h"
 #include "FindBar.h"
+#include "OpenTemplate.h"
 #include "PageBar.h"
 #include "PageDefaults.h"
 #include "PageSetupDialog.h"
@@ -12,6 +13,10 @@
 #include "ReportPrinter.h"
 #include "ReportViewWidget.h"
 #include "TemplateDialog.h"
+#include "TemplateFindBar.h"
+#include "TemplatePage.h"
+#include "TemplateTextEdit.h"
+#include "TemplateWindow.h"
 #include "UReportDoc.h"
 #include "UReportView.h"
 #include "UReportWindowDlg.h"
@@ -117,6 +122,32 @@ void takeDesk(Pictures &pictures, const QString &examples)
     }
 }
 
+/// The editor of a template: as it is opened, with what can be written, and with a text that is broken.
+void takeTemplateEditor(Pictures &pictures, const QString &examples)
+{
+    kareport::TemplateWindow &window = *new kareport::TemplateWindow;
+    window.load(QDir(examples).filePath(QStringLiteral("survey.xml")));
+    window.setData({QDir(examples).filePath(QStringLiteral("control-metric.json"))});
+    const auto putAfter = [&window](const char *text) {
+        const qsizetype at = window.edit().wholeText().indexOf(QString::fromLatin1(text)) + qsizetype(qstrlen(text));
+        window.edit().select({at, at});
+    };
+    pictures.take(window, "template-editor-first");
+    putAfter("<Label>Northing");
+    pictures.take(window, "template-editor");
+    putAfter("<Align>RIGHT");
+    window.edit().complete(true);
+    pictures.take(window, "template-editor-complete");
+    window.edit().insertPlainText(QStringLiteral("S"));
+    putAfter("<Use>Point");
+    window.edit().insertPlainText(QStringLiteral("s"));
+    window.findBar().open();
+    window.findBar().field().setText(QStringLiteral("Northing"));
+    pictures.take(window, "template-editor-broken");
+    window.edit().document()->setModified(false);
+    window.close();
+}
+
 void takeDialogs(Pictures &pictures, const QString &examples)
 {
     kareport::PreferencesDialog preferences(kareport::loadPreferences());
@@ -179,6 +210,7 @@ int main(int argc, char **argv)
     QDir().mkpath(folder);
     Pictures pictures(folder, parser.value(suffix));
     takeDesk(pictures, parser.value(examples));
+    takeTemplateEditor(pictures, parser.value(examples));
     takeDialogs(pictures, parser.value(examples));
     return pictures.isWritten() ? 0 : 1;
 }
