@@ -107,6 +107,17 @@ TEST(StakeoutAgain, ARecoveredListHasItsPagesOnSheetsInThePdfAndToGoTo)
              EXPECT_TRUE(report.ReplaceText(report.GetPageStarts().at(3) - 2, 0, u"x"));
          },
          "edited since"},
+        {[](UReportDoc &report, const JobFolder &files) {
+             EXPECT_TRUE(report.OnSaveDocument(files.path("a.rtf")));
+             report.SetPathName(files.path("a.rtf"), false);
+         },
+         "its own file is rich text"},
+        {[](UReportDoc &report, const JobFolder &files) {
+             EXPECT_TRUE(report.OnSaveDocument(files.path("a.rtf")));
+             report.SetPathName(files.path("a.rtf"), false);
+             EXPECT_TRUE(report.ReplaceText(report.GetPageStarts().at(3) - 2, 0, u"x"));
+         },
+         "rich text, edited since"},
     };
     for (const Row &row : rows) {
         SCOPED_TRACE(row.reason);

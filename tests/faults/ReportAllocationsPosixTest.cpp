@@ -49,6 +49,11 @@ constexpr ReportOperation operations[] = {
          s.report.WriteLine(line, -1, 1, 0);
          return lostNothing(s);
      }},
+    {"AnnounceEntry", Text::Same,
+     [](auto &s, auto &) {
+         s.report.AnnounceEntry(1, QStringLiteral("an entry of the outline that is not a short one"));
+         return true;
+     }},
     {"WriteHeading", Text::Written,
      [](auto &s, auto &) {
          s.report.WriteHeading();

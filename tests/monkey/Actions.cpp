@@ -120,7 +120,6 @@ void chooseFromMenu(World &world, Chance &chance)
     }
     aimKeyboard(world);
     world.did = action->text();
-    world.mayReload = true; // a file that is opened anew
     action->trigger();
 }
 
@@ -309,7 +308,6 @@ void changeFile(World &world, Chance &chance)
     }
     const QString path = paths.at(chance.below(paths.size()));
     world.did = path;
-    world.mayReload = true;
     if (chance.oneIn(4)) {
         QFile::remove(path);
     } else {
@@ -323,7 +321,6 @@ void changeFile(World &world, Chance &chance)
 
 void letTimePass(World &world, Chance &chance)
 {
-    world.mayReload = true;
     world.wait(chance.oneIn(4) ? 2500 : 650);
 }
 

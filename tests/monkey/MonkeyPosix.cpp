@@ -1,3 +1,4 @@
+#include "WorkerExit.h"
 #include "World.h"
 
 #include <QFile>
@@ -14,6 +15,11 @@ void dieAtOnce()
 {
     ::kill(::getpid(), SIGKILL);
     ::_exit(1); // not reached
+}
+
+bool isDeathAtOnce(int exitCode)
+{
+    return exitCode == SIGKILL;
 }
 
 void limitFiles(qint64 bytes)

@@ -105,7 +105,7 @@ Outcome Supervisor::run(const Steps &steps)
         if (hasEnded && worker.exitStatus() == QProcess::NormalExit && worker.exitCode() == workerIsDone) {
             return outcome;
         }
-        if (!isStuck && worker.exitStatus() == QProcess::CrashExit &&
+        if (!isStuck && worker.exitStatus() == QProcess::CrashExit && isDeathAtOnce(worker.exitCode()) &&
             lines.value(lines.size() - 1).startsWith(u"crash ")) {
             from = QString::number(outcome.step); // as it was asked to
             continue;

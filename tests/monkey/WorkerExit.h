@@ -13,4 +13,7 @@ inline const QString stepsName = QStringLiteral("steps");
 inline const QString doneName = QStringLiteral("done");
 inline const QString violationName = QStringLiteral("violation");
 
+/// Whether a worker that did not end by itself died as the step "crash" lets it: any other signal is a finding.
+bool isDeathAtOnce(int exitCode);
+
 } // namespace monkey

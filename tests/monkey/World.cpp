@@ -229,7 +229,6 @@ void World::note()
     filesBefore_ = lookAtFiles();
     answers_.take();
     mayChange.clear();
-    mayReload = false;
     did.clear();
     wrong_.clear();
 }

@@ -92,7 +92,6 @@ public:
 
     // What the step that runs says of itself.
     std::set<const UReportDoc *> mayChange; ///< texts that it edits
-    bool mayReload = false;                 ///< files were changed by another program
     QString did;                            ///< in words, for the log
 
 private:

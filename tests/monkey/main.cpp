@@ -139,15 +139,16 @@ int main(int argc, char **argv)
     bool isSeed = false;
     bool isCount = false;
     bool isRuns = false;
+    bool isSeconds = false;
     quint64 seed = parser.value(seedOption).toULongLong(&isSeed);
     const int count = parser.value(stepsOption).toInt(&isCount);
     const int runs = parser.value(runsOption).toInt(&isRuns);
-    if (!isSeed || !isCount || !isRuns || count < 1) {
+    const qint64 milliseconds = parser.value(secondsOption).toLongLong(&isSeconds) * 1000;
+    if (!isSeed || !isCount || !isRuns || !isSeconds || count < 1) {
         std::cerr
-            << "kareport-monkey: --seed, --steps and --runs are followed by numbers, as in --seed 7 --steps 300\n";
+            << "kareport-monkey: --seed, --steps, --runs and --seconds are followed by numbers, as in --seed 7 --steps 300\n";
         return 2;
     }
-    const qint64 milliseconds = parser.value(secondsOption).toLongLong() * 1000;
     QElapsedTimer time;
     time.start();
     int violations = 0;
