@@ -49,6 +49,7 @@ Job::Page readPage(const JsonNode &node, Job::Page page)
             keys.append(row.key.toString());
             if (paper.text() == row.key) {
                 page.printer.paper = row.paper;
+                page.printer.sheet = QSize();
                 known = true;
             }
         }

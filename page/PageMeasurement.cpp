@@ -42,7 +42,7 @@ QPageSize::PageSizeId sheetOf(PaperSize paper)
 PageDevice builtInDevice(const DefaultPrinter &printer, bool portrait)
 {
     // Not QPageSize::sizePixels: it counts in whole points, which is several dots off at a printer's resolution.
-    const QSizeF millimetres = QPageSize(sheetOf(printer.paper)).size(QPageSize::Millimeter);
+    const QSizeF millimetres = builtInSheet(printer).size(QPageSize::Millimeter);
     const QSize upright = (millimetres * printer.resolution / millimetresPerInch).toSize();
     return {portrait ? upright : upright.transposed(), printer.resolution};
 }
@@ -99,9 +99,15 @@ QPrinterInfo applicationPrinter()
     return installedPrinter(defaultPrinter());
 }
 
+QPageSize builtInSheet(const DefaultPrinter &printer)
+{
+    const bool isSelected = printer.replacesPrinter && !printer.sheet.isEmpty();
+    return isSelected ? QPageSize(printer.sheet) : QPageSize(sheetOf(printer.paper));
+}
+
 QPageSize builtInSheet()
 {
-    return QPageSize(sheetOf(defaultPrinter().paper));
+    return builtInSheet(defaultPrinter());
 }
 
 void setSelectedSheet(QPrinter &printer)

@@ -58,6 +58,7 @@ QPrinterInfo applicationPrinter();
 void setSelectedSheet(QPrinter &printer);
 /// The sheet of the built-in page device.
 QPageSize builtInSheet();
+QPageSize builtInSheet(const DefaultPrinter &printer);
 
 /// The extents of a fixed-pitch face at a size in points on a device. A face that is not installed is replaced by the
 /// nearest fixed-pitch face. Needs a running QGuiApplication.

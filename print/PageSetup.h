@@ -35,6 +35,8 @@ struct PageSetup
     std::optional<int> givenLines;
     /// Whether each of those pages is printed on a sheet of its own, or as many lines on a sheet as it takes.
     bool keepsGivenPages = false;
+    /// Whether lengths are shown in inches, not in millimetres.
+    bool inInches = false;
     /// The sheets that a printer takes, its own first.
     std::function<std::vector<PageSheet>(const QString &printer)> sheetsOf;
 };

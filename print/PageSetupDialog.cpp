@@ -3,6 +3,7 @@
 #include "Xlate.h"
 
 #include <QDialogButtonBox>
+#include <QPointer>
 #include <QVBoxLayout>
 
 namespace kareport
@@ -28,6 +29,18 @@ void PageSetupDialog::accept()
     if (form_->confirm()) {
         QDialog::accept();
     }
+}
+
+bool showPageSetup(PageSetup &setup, QWidget *parent)
+{
+    // The parent may be destroyed, and the dialog with it, while it is open.
+    const QPointer<PageSetupDialog> dialog = new PageSetupDialog(setup, parent);
+    const bool accepted = dialog->exec() == QDialog::Accepted && dialog != nullptr;
+    if (accepted) {
+        setup = dialog->setup();
+    }
+    delete dialog;
+    return accepted;
 }
 
 } // namespace kareport

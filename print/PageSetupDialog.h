@@ -20,4 +20,7 @@ private:
     PageSetupForm *form_;
 };
 
+/// Asks with it. @return false, with the set-up as it was, when it is cancelled
+bool showPageSetup(PageSetup &setup, QWidget *parent);
+
 } // namespace kareport

@@ -1,5 +1,6 @@
 #include "PageSetupForm.h"
 
+#include "PageUnits.h"
 #include "PlainWidgets.h"
 #include "PrintGeometry.h"
 #include "Xlate.h"
@@ -79,7 +80,7 @@ PageSetup PageSetupForm::setup() const
     for (std::size_t i = 0; i < margins_.size(); ++i) {
         // A margin that the field cannot show stays as it is until another one is entered.
         if (margins_.at(i)->value() != shownMargins_.at(i)) {
-            margins.at(i) = static_cast<int>(std::lround(margins_.at(i)->value() * hundredths));
+            margins.at(i) = static_cast<int>(std::lround(margins_.at(i)->value() * hundredths()));
         }
     }
     setup.margins = QMargins(margins[0], margins[1], margins[2], margins[3]);
@@ -127,11 +128,27 @@ void PageSetupForm::showSheet()
     const QSizeF upright = chosenSheet() != nullptr ? chosenSheet()->millimetres : QSizeF();
     const QSizeF sheet = portrait_->isChecked() ? upright : upright.transposed();
     const QLocale locale;
-    sheet_->setText(
-        Xlate("Paper: %1 x %2 mm")
-            .arg(locale.toString(std::lround(sheet.width())), locale.toString(std::lround(sheet.height()))));
+    if (setup_.inInches) {
+        const QSizeF inches = sheet / millimetresPerInch;
+        sheet_->setText(Xlate("Paper: %1 x %2 in")
+                            .arg(locale.toString(inches.width(), 'f', 2), locale.toString(inches.height(), 'f', 2)));
+    } else {
+        sheet_->setText(
+            Xlate("Paper: %1 x %2 mm")
+                .arg(locale.toString(std::lround(sheet.width())), locale.toString(std::lround(sheet.height()))));
+    }
     sheet_->setVisible(!upright.isEmpty());
     checkMargins();
+}
+
+void PageSetupForm::showInInches(bool inInches)
+{
+    if (inInches != setup_.inInches) {
+        setup_.margins = setup().margins;
+        setup_.inInches = inInches;
+        fillMargins();
+        showSheet();
+    }
 }
 
 void PageSetupForm::checkMargins()

@@ -24,17 +24,20 @@ public:
 
     /// What the user has chosen; the rest as it was given.
     PageSetup setup() const;
+    /// Shows lengths in inches, or in millimetres.
+    void showInInches(bool inInches);
     /// Whether the margins leave room for text. Where they do not, the form says so and leads to them.
     bool confirm();
 
 private:
-    static constexpr int hundredths = 100;                      ///< of a millimetre
     static std::array<int, 4> inOrder(const QMargins &margins); ///< left, top, right, bottom
 
     void addPrinter(QVBoxLayout &layout);
     void addOrientation(QVBoxLayout &layout);
     void addMargins(QVBoxLayout &layout);
     void addPages(QVBoxLayout &layout);
+    void fillMargins();
+    double hundredths() const; ///< of a millimetre, in the unit that is shown
     bool leavesRoom() const;
     const PageSheet *chosenSheet() const; ///< null when nothing is known of the printer's sheets
     void fillSheets();

@@ -1,5 +1,6 @@
 #include "PageSetupForm.h"
 
+#include "PageUnits.h"
 #include "PlainWidgets.h"
 #include "Xlate.h"
 
@@ -74,7 +75,6 @@ void PageSetupForm::addOrientation(QVBoxLayout &layout)
 
 void PageSetupForm::addMargins(QVBoxLayout &layout)
 {
-    constexpr double mostMargin = 2000.0; // millimetres
     constexpr int columns = 2;
     auto *margins = new QGroupBox(Xlate("Margins"));
     auto *marginsLayout = new QGridLayout(margins);
@@ -85,11 +85,6 @@ void PageSetupForm::addMargins(QVBoxLayout &layout)
     constexpr std::array<std::pair<int, int>, 4> places = {{{0, 0}, {1, 0}, {0, 1}, {1, 1}}};
     for (std::size_t i = 0; i < margins_.size(); ++i) {
         auto *field = new QDoubleSpinBox;
-        field->setDecimals(2);
-        field->setRange(0, mostMargin);
-        field->setSuffix(Xlate(" mm"));
-        field->setValue(double(inOrder(setup_.margins).at(i)) / hundredths);
-        shownMargins_.at(i) = field->value();
         field->setAccessibleName(names.at(i));
         auto *label = plainLabel(labels.at(i));
         label->setBuddy(field);
@@ -98,11 +93,31 @@ void PageSetupForm::addMargins(QVBoxLayout &layout)
         connect(field, &QDoubleSpinBox::valueChanged, this, &PageSetupForm::checkMargins);
         margins_.at(i) = field;
     }
+    fillMargins();
     marginsLayout->setColumnStretch(2 * columns, 1);
     QWidget::setTabOrder(margins_[0], margins_[2]);
     QWidget::setTabOrder(margins_[2], margins_[1]);
     QWidget::setTabOrder(margins_[1], margins_[3]);
     layout.addWidget(margins);
+}
+
+double PageSetupForm::hundredths() const
+{
+    return setup_.inInches ? hundredthsPerInch : 100;
+}
+
+void PageSetupForm::fillMargins()
+{
+    constexpr double mostMargin = 200'000; // hundredths of a millimetre
+    for (std::size_t i = 0; i < margins_.size(); ++i) {
+        QDoubleSpinBox &field = *margins_.at(i);
+        field.setDecimals(setup_.inInches ? 3 : 2);
+        field.setSingleStep(setup_.inInches ? 0.1 : 1);
+        field.setRange(0, mostMargin / hundredths());
+        field.setSuffix(setup_.inInches ? Xlate(" in@@inches, after a number") : Xlate(" mm"));
+        field.setValue(inOrder(setup_.margins).at(i) / hundredths());
+        shownMargins_.at(i) = field.value();
+    }
 }
 
 void PageSetupForm::addPages(QVBoxLayout &layout)

@@ -69,13 +69,7 @@ bool askPageSetup(PageSetup &setup, QWidget *parent)
     if (installed().pageSetup) {
         return installed().pageSetup(setup, parent);
     }
-    const QPointer<PageSetupDialog> dialog = new PageSetupDialog(setup, parent);
-    const bool accepted = dialog->exec() == QDialog::Accepted && dialog != nullptr;
-    if (accepted) {
-        setup = dialog->setup();
-    }
-    delete dialog;
-    return accepted;
+    return showPageSetup(setup, parent);
 }
 
 } // namespace kareport

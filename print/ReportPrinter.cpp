@@ -18,14 +18,15 @@ namespace kareport
 namespace
 {
 
-bool isBuiltIn()
+bool replacesPrinter()
 {
-    return defaultPrinter().source == PrinterSource::BuiltIn;
+    const DefaultPrinter &printer = defaultPrinter();
+    return printer.replacesPrinter && printer.source == PrinterSource::SystemOrBuiltIn && applicationPrinter().isNull();
 }
 
-PageSheet asSheet(const QPageSize &size)
+bool isBuiltIn()
 {
-    return {size.name(), size.sizePoints(), size.size(QPageSize::Millimeter)};
+    return defaultPrinter().source == PrinterSource::BuiltIn || replacesPrinter();
 }
 
 QString fileFor(const QString &title)
@@ -39,7 +40,32 @@ QString fileFor(const QString &title)
                            QStringLiteral(".pdf"));
 }
 
+/// Those of the page device that takes the place of a printer.
+std::vector<PageSheet> builtInSheets()
+{
+    DefaultPrinter own = defaultPrinter();
+    own.sheet = QSize();
+    return usualSheets(builtInSheet(own));
+}
+
 } // namespace
+
+PageSheet pageSheet(const QPageSize &size)
+{
+    return {size.name(), size.sizePoints(), size.size(QPageSize::Millimeter)};
+}
+
+std::vector<PageSheet> usualSheets(const QPageSize &first)
+{
+    std::vector<PageSheet> sheets;
+    sheets.push_back(pageSheet(first));
+    for (const auto id : {QPageSize::A4, QPageSize::A3, QPageSize::Letter, QPageSize::Legal}) {
+        if (id != first.id()) {
+            sheets.push_back(pageSheet(QPageSize(id)));
+        }
+    }
+    return sheets;
+}
 
 bool hasReportPrinter()
 {
@@ -76,8 +102,13 @@ QSize sheetInTwips(const QPrinter &printer)
 
 void fillPrinters(PageSetup &setup)
 {
+    if (replacesPrinter()) {
+        setup.sheet = defaultPrinter().sheet;
+        setup.sheetsOf = [](const QString &) { return builtInSheets(); };
+        return;
+    }
     if (isBuiltIn()) {
-        setup.sheetsOf = [](const QString &) { return std::vector{asSheet(builtInSheet())}; };
+        setup.sheetsOf = [](const QString &) { return std::vector{pageSheet(builtInSheet())}; };
         return;
     }
     setup.printer = applicationPrinter().printerName();
@@ -87,12 +118,12 @@ void fillPrinters(PageSetup &setup)
         const QPrinterInfo info = QPrinterInfo::printerInfo(name);
         std::vector<PageSheet> sheets;
         if (info.isNull()) {
-            sheets.push_back(asSheet(builtInSheet())); // which takes the place of a printer
+            sheets.push_back(pageSheet(builtInSheet())); // which takes the place of a printer
         } else {
-            sheets.push_back(asSheet(info.defaultPageSize()));
+            sheets.push_back(pageSheet(info.defaultPageSize()));
             for (const QPageSize &size : info.supportedPageSizes()) {
                 if (!size.isEquivalentTo(info.defaultPageSize())) {
-                    sheets.push_back(asSheet(size));
+                    sheets.push_back(pageSheet(size));
                 }
             }
         }

@@ -34,6 +34,9 @@ struct DefaultPrinter
     int resolution = 600;                                  ///< of the built-in page device, dots per inch
     QString name = QString(); ///< of the installed printer that the user has selected; empty for the system's
     QSize sheet = QSize();    ///< of the installed printer, upright, in points; empty for the printer's own
+    /// Whether reports are previewed, set up and printed also where no printer is installed: on the built-in page device, into
+    /// a PDF. `sheet` then counts for that device as well.
+    bool replacesPrinter = false;
 };
 
 /// The printer that pages are measured on and printed by; the system's, or the built-in page device, until it is set.

@@ -108,6 +108,37 @@ TEST(PageSetupDialog, ShowsMillimetresAndKeepsHundredths)
     }
 }
 
+TEST(PageSetupDialog, ShowsInchesWhereTheyAreWantedAndKeepsWhatWasNotChanged)
+{
+    PageSetup setup = usualSetup();
+    setup.inInches = true;
+    const PageSetupDialog dialog(setup);
+    EXPECT_EQ(field(dialog, "Left margin")->suffix(), QStringLiteral(" in"));
+    EXPECT_DOUBLE_EQ(field(dialog, "Left margin")->value(), 0.394);
+    EXPECT_EQ(dialog.setup().margins, setup.margins) << "10 mm are not 0.394 in, and stay 10 mm";
+    field(dialog, "Left margin")->setValue(0.5);
+    EXPECT_EQ(dialog.setup().margins, QMargins(1270, 1001, 1200, 2000));
+    bool isSaid = false;
+    for (const auto *label : dialog.findChildren<QLabel *>()) {
+        isSaid = isSaid || label->text() == QStringLiteral("Paper: 8.27 x 11.69 in");
+    }
+    EXPECT_TRUE(isSaid);
+}
+
+TEST(PageSetupDialog, TheUnitCanBeChangedMeanwhile)
+{
+    kareport::PageSetupForm form(usualSetup());
+    const auto left = [&form] { return form.findChildren<QDoubleSpinBox *>().front(); };
+    left()->setValue(25.4);
+    form.showInInches(true);
+    EXPECT_DOUBLE_EQ(left()->value(), 1);
+    EXPECT_EQ(form.setup().margins, QMargins(2540, 1001, 1200, 2000));
+    form.showInInches(false);
+    EXPECT_DOUBLE_EQ(left()->value(), 25.4);
+    EXPECT_EQ(form.setup().margins, QMargins(2540, 1001, 1200, 2000)) << "there and back changes nothing";
+    EXPECT_FALSE(form.setup().inInches);
+}
+
 TEST(PageSetupDialog, IsWorkedWithTheKeyboardAlone)
 {
     PageSetupDialog dialog(usualSetup());
