@@ -42,6 +42,18 @@ qreal settledHeight(qreal height, int lineHeight, int lines, qreal rounding)
     return lines > 0 && (lacksRounding || exceedsByRounding) ? usual : height;
 }
 
+/// From the dots of the type's own size to those of the sheet.
+void putOnSheet(std::vector<PageRow> &places, QPointF corner, qreal scale)
+{
+    for (PageRow &row : places) {
+        row.top = corner.y() + row.top * scale;
+        row.height *= scale;
+        for (qreal &edge : row.edges) {
+            edge = corner.x() + edge * scale;
+        }
+    }
+}
+
 } // namespace
 
 LinePager::LinePager(const QTextDocument &text, QPaintDevice &device)
@@ -60,7 +72,7 @@ SheetRoom LinePager::room(const QRect &twips) const
             dotsOf(twips.height(), device_.logicalDpiY()) + rounding};
 }
 
-qint64 LinePager::layOut(const QRect &twips, qint64 start, qint64 stop, QPainter *painter)
+qint64 LinePager::layOut(const QRect &twips, qint64 start, qint64 stop, QPainter *painter, std::vector<PageRow> *places)
 {
     const qint64 end = stop < 0 ? length() : std::min(stop, length());
     if (start < 0 || start >= end || twips.isEmpty()) {
@@ -73,10 +85,11 @@ qint64 LinePager::layOut(const QRect &twips, qint64 start, qint64 stop, QPainter
     area.width = room(twips).width;
     area.height =
         settledHeight(dotsOf(twips.height(), resolution), faces_.base().height, usualLines_, roundingOf(resolution));
-    return layOutIn(area, start, end, painter);
+    return layOutIn(area, start, end, painter, places);
 }
 
-qint64 LinePager::layOutScaled(const QRect &twips, qint64 start, qint64 stop, qreal scale, QPainter *painter)
+qint64 LinePager::layOutScaled(const QRect &twips, qint64 start, qint64 stop, qreal scale, QPainter *painter,
+                               std::vector<PageRow> *places)
 {
     const qint64 end = stop < 0 ? length() : std::min(stop, length());
     if (start < 0 || start >= end || twips.isEmpty() || scale <= 0) {
@@ -87,21 +100,27 @@ qint64 LinePager::layOutScaled(const QRect &twips, qint64 start, qint64 stop, qr
     PageArea area;
     area.width = sheet.width / scale + lostDots;
     area.height = sheet.height / scale + lostDots;
-    if (painter == nullptr) {
-        return layOutIn(area, start, end, nullptr);
+    const QPointF corner(std::round(dotsOf(twips.x(), device_.logicalDpiX())),
+                         std::round(dotsOf(twips.y(), device_.logicalDpiY())));
+    if (painter != nullptr) {
+        painter->save();
+        painter->translate(corner);
+        painter->scale(scale, scale);
     }
-    painter->save();
-    painter->translate(std::round(dotsOf(twips.x(), device_.logicalDpiX())),
-                       std::round(dotsOf(twips.y(), device_.logicalDpiY())));
-    painter->scale(scale, scale);
-    const qint64 next = layOutIn(area, start, end, painter);
-    painter->restore();
+    const qint64 next = layOutIn(area, start, end, painter, places);
+    if (painter != nullptr) {
+        painter->restore();
+    }
+    if (places != nullptr) {
+        putOnSheet(*places, corner, scale);
+    }
     return next;
 }
 
-qint64 LinePager::layOutIn(const PageArea &area, qint64 start, qint64 end, QPainter *painter)
+qint64 LinePager::layOutIn(const PageArea &area, qint64 start, qint64 end, QPainter *painter,
+                           std::vector<PageRow> *places)
 {
-    PageRows rows(text_, faces_, device_, area, painter);
+    PageRows rows(text_, faces_, device_, area, painter, places);
     QTextBlock block = text_.findBlock(static_cast<int>(start));
     qint64 next = start;
     while (next < end) {

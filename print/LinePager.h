@@ -1,10 +1,13 @@
 #pragma once
 
 #include "PageFit.h"
+#include "PageRow.h"
 #include "PrintFaces.h"
 
 #include <QRect>
 #include <QtGlobal>
+
+#include <vector>
 
 class QPaintDevice;
 class QPainter;
@@ -38,11 +41,14 @@ public:
     qint64 length() const;
 
     /// Lays out the characters from `start` to `stop` (-1: to the end) as far as they fit a rectangle in twips.
-    /// @param painter  draws them where it is not null; it must paint on the pager's device
+    /// @param painter  draws them where it is not null; it must paint on the pager's device, or in its dots
+    /// @param places   receives where each row is on the sheet; may be null
     /// @return the first character that did not fit; `start` where the rectangle is empty
-    qint64 layOut(const QRect &twips, qint64 start, qint64 stop, QPainter *painter = nullptr);
+    qint64 layOut(const QRect &twips, qint64 start, qint64 stop, QPainter *painter = nullptr,
+                  std::vector<PageRow> *places = nullptr);
     /// The same in type of another size: `scale` times its own. The usual lines do not count.
-    qint64 layOutScaled(const QRect &twips, qint64 start, qint64 stop, qreal scale, QPainter *painter = nullptr);
+    qint64 layOutScaled(const QRect &twips, qint64 start, qint64 stop, qreal scale, QPainter *painter = nullptr,
+                        std::vector<PageRow> *places = nullptr);
 
     /// The lines from `start` to `stop` as one page at their own size, none of them broken; lengths in dots.
     PageText measure(qint64 start, qint64 stop);
@@ -50,7 +56,7 @@ public:
     SheetRoom room(const QRect &twips) const;
 
 private:
-    qint64 layOutIn(const PageArea &area, qint64 start, qint64 end, QPainter *painter);
+    qint64 layOutIn(const PageArea &area, qint64 start, qint64 end, QPainter *painter, std::vector<PageRow> *places);
 
     const QTextDocument &text_;
     QPaintDevice &device_;

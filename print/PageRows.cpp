@@ -16,8 +16,8 @@ namespace kareport
 {
 
 PageRows::PageRows(const QTextDocument &text, PrintFaces &faces, QPaintDevice &device, const PageArea &area,
-                   QPainter *painter)
-    : text_(text), faces_(faces), device_(device), area_(area), painter_(painter)
+                   QPainter *painter, std::vector<PageRow> *places)
+    : text_(text), faces_(faces), device_(device), area_(area), painter_(painter), noted_(places)
 {
     if (painter_ != nullptr) {
         painter_->save();
@@ -36,6 +36,7 @@ PageRows::~PageRows()
 int PageRows::addLine(const QTextBlock &block, int from, int stop)
 {
     line_ = block.text();
+    lineStart_ = block.position();
     readRuns(block, from, stop);
     const qreal width = plainWidth();
     if (width < 0 || width > area_.width) {
@@ -47,6 +48,9 @@ int PageRows::addLine(const QTextBlock &block, int from, int stop)
     }
     if (painter_ != nullptr) {
         drawRuns(area_.top + y_ + line.ascent);
+    }
+    if (noted_ != nullptr) {
+        notePlace(from, stop, line.height);
     }
     y_ += line.height;
     return stop;
@@ -165,6 +169,36 @@ void PageRows::drawGlyphs(const Run &run, qreal x, qreal baseline)
         glyphs.setRawData(glyphs_.data(), places_.data(), static_cast<int>(glyphs_.size()));
         painter_->drawGlyphRun(QPointF(x, baseline), glyphs);
     }
+}
+
+void PageRows::addEdges(std::vector<qreal> &edges, int from, int stop) const
+{
+    qreal x = area_.left;
+    for (const Run &run : runs_) {
+        const QStringView text = QStringView(line_).mid(run.from, run.length);
+        const bool isEven = hasGlyphs(*run.face, text);
+        const QFontMetricsF metrics(run.face->font, &device_);
+        for (int i = 0; i < run.length; ++i) {
+            const int at = run.from + i;
+            if (at >= from && at < stop) {
+                edges.push_back(
+                    x + (isEven ? qreal(i) * run.face->pitch : metrics.horizontalAdvance(text.first(i).toString())));
+            }
+        }
+        x += widthOf(run);
+    }
+    edges.push_back(x);
+}
+
+void PageRows::notePlace(int from, int stop, int height)
+{
+    PageRow row;
+    row.start = qint64(lineStart_) + from;
+    row.stop = qint64(lineStart_) + stop;
+    row.top = area_.top + y_;
+    row.height = height;
+    addEdges(row.edges, from, stop);
+    noted_->push_back(std::move(row));
 }
 
 PageRows::LineSize PageRows::measureLine(const QTextBlock &block)

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "PageRow.h"
 #include "PrintFaces.h"
 
 #include <QString>
@@ -29,8 +30,9 @@ class PageRows
 {
 public:
     /// @param painter  draws the rows where it is not null
+    /// @param places   receives where each row is; may be null
     PageRows(const QTextDocument &text, PrintFaces &faces, QPaintDevice &device, const PageArea &area,
-             QPainter *painter);
+             QPainter *painter, std::vector<PageRow> *places = nullptr);
     ~PageRows();
     PageRows(const PageRows &) = delete;
     PageRows &operator=(const PageRows &) = delete;
@@ -73,6 +75,8 @@ private:
     Extents extents(int from, int stop) const;
     static bool hasGlyphs(const PrintFace &face, QStringView text);
     qreal widthOf(const Run &run) const;
+    void notePlace(int from, int stop, int height);
+    void addEdges(std::vector<qreal> &edges, int from, int stop) const;
     void drawRuns(qreal baseline);
     void drawGlyphs(const Run &run, qreal x, qreal baseline);
     void use(const PrintFace &face);
@@ -84,9 +88,11 @@ private:
     QPaintDevice &device_;
     const PageArea area_;
     QPainter *painter_;
+    std::vector<PageRow> *noted_;
     bool drawsGlyphs_ = false;
     const PrintFace *used_ = nullptr;
     QString line_;
+    int lineStart_ = 0; ///< of the line, in the text
     std::vector<Run> runs_;
     std::vector<quint32> glyphs_;
     std::vector<QPointF> places_;

@@ -93,6 +93,14 @@ int PageRows::addWrapped(int from, int stop)
                 const qreal baseline = area_.top + y_ + taken.ascent;
                 row.draw(painter_, QPointF(area_.left, baseline - row.ascent()) - row.position());
             }
+            if (noted_ != nullptr) {
+                PageRow place{
+                    qint64(lineStart_) + from, qint64(lineStart_) + rowEnd, area_.top + y_, qreal(taken.height), {}};
+                for (int at = from; at <= rowEnd; ++at) {
+                    place.edges.push_back(area_.left + row.cursorToX(at - pieceStart) - row.x());
+                }
+                noted_->push_back(std::move(place));
+            }
             y_ += taken.height;
             from = rowEnd;
         }
