@@ -39,4 +39,11 @@ const ReportHooks &ReportAccess::hooks(const UReportDoc &report)
     return report.parts_->hooks;
 }
 
+PageGeometry ReportAccess::printedPage(const UReportDoc &report)
+{
+    PageLayout layout = report.parts_->layout;
+    layout.measure(report.parts_->pageDevice()); // without a printer it stays as it is
+    return layout.geometry();
+}
+
 } // namespace kareport

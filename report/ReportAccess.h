@@ -10,6 +10,7 @@ class ResultSink;
 class WrittenCells;
 struct DataRemarks;
 struct LoadedText;
+struct PageGeometry;
 
 /// What a job has its report written with. Nothing of it is owned.
 struct ReportHooks
@@ -33,6 +34,9 @@ struct ReportAccess
     /// Sets what is written from now on is written with. With placeholders its pages have page marks.
     static void setHooks(UReportDoc &report, const ReportHooks &hooks);
     static const ReportHooks &hooks(const UReportDoc &report);
+
+    /// The page as `UReportDoc::SetPageSize` would measure it now. The report keeps its own.
+    static PageGeometry printedPage(const UReportDoc &report);
 };
 
 } // namespace kareport

@@ -105,6 +105,17 @@ void FindBar::hideEvent(QHideEvent *event)
     counter_.stop();
     count_->clear();
     QWidget::hideEvent(event);
+    if (shown_) {
+        shown_();
+    }
+}
+
+void FindBar::showEvent(QShowEvent *event)
+{
+    QWidget::showEvent(event);
+    if (shown_) {
+        shown_();
+    }
 }
 
 bool FindBar::eventFilter(QObject *watched, QEvent *event)

@@ -5,6 +5,8 @@
 
 #include <QWidget>
 
+#include <functional>
+
 class QCheckBox;
 class QLabel;
 class QLineEdit;
@@ -31,6 +33,10 @@ public:
     bool findNext();
     bool findPrevious();
 
+    /// What is looked for.
+    const TextSearch &search() const { return search_; }
+    /// Called when the bar was opened or closed.
+    void setShownHandler(std::function<void()> handler) { shown_ = std::move(handler); }
     QLineEdit &field() const { return *field_; }
     QCheckBox &matchCase() const { return *matchCase_; }
     QCheckBox &wholeWord() const { return *wholeWord_; }
@@ -43,6 +49,7 @@ public:
 protected:
     bool eventFilter(QObject *watched, QEvent *event) override;
     void hideEvent(QHideEvent *event) override;
+    void showEvent(QShowEvent *event) override;
 
 private:
     void searchChanged();
@@ -63,6 +70,7 @@ private:
     TextSearch search_;
     MatchCounter counter_;
     QTimer recountTimer_;
+    std::function<void()> shown_;
 };
 
 } // namespace kareport

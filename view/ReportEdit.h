@@ -60,6 +60,9 @@ public:
     void setZoomHandler(std::function<void()> handler) { zoomed_ = std::move(handler); }
     /// Called when more of the text has been loaded.
     void setLoadHandler(std::function<void()> handler) { loading_ = std::move(handler); }
+    /// Draws a line before each line of the text that begins a page. @param pageOf  the page that a line, from 0, begins; 0
+    /// where it begins none. Empty for no lines
+    void setPageBeginnings(std::function<int(int line)> pageOf);
     /// Makes an edit that was made elsewhere. The handler of edits is not called.
     /// @return false, changing nothing, when the control does not hold the text that the edit was made in
     bool applyChange(const ReportChange &change);
@@ -118,12 +121,14 @@ private:
     void noteEdit(int position, int removed, int added);
     void noteLength();
     void applyZoom();
+    void drawPageLines(QPaintEvent &event);
     void keepGlyphs(int line, bool on);
 
     std::function<void(const ReportChange &)> edited_;
     std::function<void()> focused_;
     std::function<void()> zoomed_;
     std::function<void()> loading_;
+    std::function<int(int)> pageBegunBy_;
     QMetaObject::Connection watching_;
     std::unique_ptr<PieceLoader> loader_;
     std::function<void(bool)> loaded_; ///< called when `loader_` has done

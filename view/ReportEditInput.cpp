@@ -164,6 +164,9 @@ void ReportEdit::paintEvent(QPaintEvent *event)
     }
     keepGlyphs(keptLine_, true);
     QPlainTextEdit::paintEvent(event);
+    if (pageBegunBy_) {
+        drawPageLines(*event);
+    }
 }
 
 void ReportEdit::insertFromMimeData(const QMimeData *source)

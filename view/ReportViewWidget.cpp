@@ -60,14 +60,15 @@ ReportViewWidget::ReportViewWidget(QWidget *parent)
       edit_(new ReportEdit(this)),
       findBar_(new FindBar(*edit_, this)),
       pageBar_(
-          new PageBar([this](int page) { goToPage(page); }, [this] { edit_->setFocus(Qt::OtherFocusReason); }, this)),
+          new PageBar([this](int page) { goFromBar(page); }, [this] { edit_->setFocus(Qt::OtherFocusReason); }, this)),
       pageLabel_(newLabel(this, Xlate("Page"), Xlate("Page %1 of %2").arg(88888).arg(88888))),
       lineLabel_(newLabel(this, Xlate("Line"), Xlate("Line %1").arg(8888888))),
       columnLabel_(newLabel(this, Xlate("Column"), Xlate("Column %1").arg(8888))),
       loadLabel_(newLabel(this, Xlate("Loading"), Xlate("Loading %1 %@@percent of a report").arg(100))),
-      zoomLabel_(newLabel(this, Xlate("Zoom"), Xlate("%1 %@@zoom in percent").arg(888)))
+      zoomLabel_(newLabel(this, Xlate("Zoom"), Xlate("%1 %@@zoom in percent").arg(888))),
+      statusRow_(new QHBoxLayout)
 {
-    auto *status = new QHBoxLayout;
+    QHBoxLayout *status = statusRow_;
     status->setContentsMargins(6, 2, 6, 2);
     status->setSpacing(12);
     status->addWidget(pageLabel_);
@@ -159,6 +160,44 @@ void ReportViewWidget::followEdit(const ReportChange &change, const std::vector<
     }
 }
 
+std::vector<ReportPage> ReportViewWidget::reportPages() const
+{
+    const QTextDocument &document = *edit_->document();
+    std::vector<ReportPage> found;
+    if (document.isEmpty()) {
+        return found;
+    }
+    // Found anew: what is shown below the text may not have followed the report yet.
+    PageLines begun;
+    begun.load(pageStarts_ ? pageStarts_() : std::vector<int>(), document.blockCount(),
+               [this](int line) { return isBlankLine(line); });
+    const int lines = linesPerPage();
+    const int count = begun.pageCount(lines);
+    for (int page = 1; page <= count; ++page) {
+        const int first = begun.firstLineOf(page, lines);
+        int last = (page < count ? begun.firstLineOf(page + 1, lines) : document.blockCount()) - 1;
+        while (last >= first && isBlankLine(last)) {
+            --last;
+        }
+        const qint64 begin = document.findBlockByNumber(first).position();
+        const QTextBlock end = document.findBlockByNumber(last);
+        const qint64 stop = std::min<qint64>(end.position() + end.length(), document.characterCount() - 1);
+        found.push_back(last < first ? ReportPage{begin, begin, 0} : ReportPage{begin, stop, last - first + 1});
+    }
+    return found;
+}
+
+int ReportViewWidget::pageBegunBy(int line) const
+{
+    const int page = pages().pageOf(line, linesPerPage());
+    return line > 0 && pages().firstLineOf(page, linesPerPage()) == line ? page : 0;
+}
+
+void ReportViewWidget::setShowsPageLines(bool on)
+{
+    edit_->setPageBeginnings(on ? [this](int line) { return pageBegunBy(line); } : std::function<int(int)>());
+}
+
 int ReportViewWidget::pageCount() const
 {
     return pages().pageCount(linesPerPage());
@@ -181,9 +220,16 @@ void ReportViewWidget::goToPage(int page)
 void ReportViewWidget::showPlace()
 {
     const QTextCursor cursor = edit_->textCursor();
+    if (shownPages_ != pageCount()) {
+        shownPages_ = pageCount();
+        edit_->viewport()->update(); // the lines between pages
+    }
     showIn(*pageLabel_, Xlate("Page %1 of %2").arg(currentPage()).arg(pageCount()));
     showIn(*lineLabel_, Xlate("Line %1").arg(cursor.blockNumber() + 1));
     showIn(*columnLabel_, Xlate("Column %1").arg(columnOf(cursor)));
+    if (placed_) {
+        placed_();
+    }
 }
 
 void ReportViewWidget::showLoading()
@@ -199,6 +245,9 @@ void ReportViewWidget::showLoading()
 void ReportViewWidget::showZoom()
 {
     showIn(*zoomLabel_, Xlate("%1 %@@zoom in percent").arg(edit_->zoomPercent()));
+    if (placed_) {
+        placed_();
+    }
 }
 
 void ReportViewWidget::showEvent(QShowEvent *event)

@@ -1,13 +1,16 @@
 #pragma once
 
 #include "PageLines.h"
+#include "ReportPage.h"
 
 #include <QTimer>
 #include <QWidget>
 
 #include <functional>
+#include <optional>
 #include <vector>
 
+class QHBoxLayout;
 class QLabel;
 class QTextDocument;
 
@@ -35,6 +38,8 @@ public:
     /// How much of a long report has been loaded; empty when all of it is there.
     QLabel &loadLabel() const { return *loadLabel_; }
     QLabel &zoomLabel() const { return *zoomLabel_; }
+    /// The line that they are in.
+    QHBoxLayout &statusRow() const { return *statusRow_; }
 
     /// Where the lines of a page are asked for; 72 without.
     void setLinesPerPage(std::function<int()> linesPerPage);
@@ -49,12 +54,28 @@ public:
     /// Called when the window comes to be seen after it was hidden.
     void setShowHandler(std::function<void()> handler) { shown_ = std::move(handler); }
 
+    /// Called when the place of the cursor, the number of pages or the zoom is shown anew.
+    void setPlaceHandler(std::function<void()> handler) { placed_ = std::move(handler); }
+    /// Other pages than those of the text, to which the page bar goes.
+    struct OtherPages
+    {
+        int current = 0; ///< from 1
+        int count = 0;
+        std::function<void(int page)> go;
+    };
+    /// Asked whenever the page bar is used; where nothing comes back it is about the pages of the text.
+    void setOtherPages(std::function<std::optional<OtherPages>()> pages) { otherPages_ = std::move(pages); }
+    /// Whether the text shows where pages begin. It does not at first.
+    void setShowsPageLines(bool on);
+
     void openFindBar();
     void openPageBar();
     /// Finds on, or opens the find bar when nothing has been looked for yet.
     void findNext();
     void findPrevious();
 
+    /// The pages of the text, as `reportPages` finds them, without looking at all of it.
+    std::vector<ReportPage> reportPages() const;
     int pageCount() const;
     int currentPage() const; ///< from 1
     /// Puts the cursor at the beginning of a page and shows it at the top. @param page  brought into 1 to `pageCount`
@@ -73,9 +94,11 @@ private:
 
     Action actionOfKey(const QKeyEvent &event) const;
     void closeBar();
+    void goFromBar(int page);
     int linesPerPage() const;
     const PageLines &pages() const;
     bool isBlankLine(int line) const;
+    int pageBegunBy(int line) const;
     void showLoading();
     void showZoom();
 
@@ -87,7 +110,9 @@ private:
     QLabel *columnLabel_;
     QLabel *loadLabel_;
     QLabel *zoomLabel_;
-    QTimer placeTimer_; ///< shows the place again
+    QHBoxLayout *statusRow_;
+    int shownPages_ = 0; ///< their number
+    QTimer placeTimer_;  ///< shows the place again
     std::function<int()> linesPerPage_;
     std::function<std::vector<int>()> pageStarts_;
     mutable PageLines pages_; ///< of the text of a document at a revision
@@ -95,6 +120,8 @@ private:
     mutable int pagesRevision_ = 0;
     std::function<void()> pressed_;
     std::function<void()> shown_;
+    std::function<void()> placed_;
+    std::function<std::optional<OtherPages>()> otherPages_;
 };
 
 } // namespace kareport

@@ -22,7 +22,20 @@ void ReportViewWidget::openPageBar()
 {
     findBar_->hide();
     edit_->finishLoading();
-    pageBar_->open(currentPage(), pageCount());
+    if (const auto other = otherPages_ ? otherPages_() : std::nullopt) {
+        pageBar_->open(other->current, other->count);
+    } else {
+        pageBar_->open(currentPage(), pageCount());
+    }
+}
+
+void ReportViewWidget::goFromBar(int page)
+{
+    if (const auto other = otherPages_ ? otherPages_() : std::nullopt) {
+        other->go(page);
+    } else {
+        goToPage(page);
+    }
 }
 
 void ReportViewWidget::findNext()

@@ -28,6 +28,7 @@ class ReportViewWidget;
 struct PrintRun;
 struct PrintSheet;
 struct ReportChange;
+struct ReportPage;
 
 /// A print job as the view sees it.
 struct PrintInfo
@@ -37,6 +38,8 @@ struct PrintInfo
     int maxPage = 0;             ///< the last page; 0 when there is none
     bool direct = false;         ///< the user is not asked for printer and pages
     bool preview = false;        ///< shown on the screen: the user is not asked for printer and pages
+    qint64 first = 0;            ///< the first character that is printed
+    qint64 last = -1;            ///< before here; -1 for the end of the text
     /// The printer, where it has been prepared for the job and not been given.
     std::shared_ptr<QPrinter> ownPrinter;
 };
@@ -103,6 +106,9 @@ public:
     // Printing
     /// @param direct  prints on the prepared printer without asking for printer and pages
     void OnReportPrint(bool direct = false);
+    /// Prints the lines that are selected, from the top of a sheet on, after asking for printer and pages. Nothing happens
+    /// without a selection.
+    void OnPrintSelection();
     /// Shows the pages as they would be printed; nothing is printed unless the user says so there.
     void OnReportPrintPreview();
     /// Asks for paper, orientation and margins, keeps them as preferences and measures the page of the report again.
@@ -131,6 +137,15 @@ public:
     /// The first character of each page that is known, page 1 first.
     const std::vector<qint64> &GetPageStarts() const { return m_aPageStart; }
 
+protected:
+    /// Called when the text has been loaded, or its pages may have become others in any other way than by an edit.
+    virtual void OnPagesForgotten();
+    /// Called when the control's text has been edited, here or in another view of the report.
+    virtual void OnTextEdited(const kareport::ReportChange &change);
+    /// The pages of the text that the control shows, where each is printed on sheets of its own; nothing where lines flow from
+    /// sheet to sheet.
+    std::optional<std::vector<kareport::ReportPage>> FindGivenPages() const;
+
 private:
     void WrapChanged();
     bool loadInPieces();
@@ -156,6 +171,12 @@ private:
     template <typename Work>
     qint64 withPager(QPaintDevice &device, Work work) const;
     bool printsGivenPages() const;
+    bool printsSheets(const kareport::PrintInfo &info) const;
+    qint64 layOutFrom(qint64 start, const kareport::PrintInfo &info, QPaintDevice &device, QPainter *painter) const;
+    /// After the last character that is printed.
+    qint64 endOf(const kareport::PrintInfo &info) const;
+    qreal usualScale() const;
+    void print(kareport::PrintInfo &info);
     std::vector<kareport::Command> makeCommands();
     void takeEdit(const kareport::ReportChange &change);
     void followEdit(const kareport::ReportChange &change);

@@ -40,9 +40,10 @@ void UReportView::OnPageSetup()
     report->SetPageSize();
     report->SaveSettings();
     for (UView *view : report->GetViews()) {
-        const auto *shown = dynamic_cast<UReportView *>(view);
+        auto *shown = dynamic_cast<UReportView *>(view);
         if (shown != nullptr && shown->widget_) {
             static_cast<kareport::ReportViewWidget *>(shown->widget_.data())->showPlace();
+            shown->OnPagesForgotten();
         }
     }
     // After the measurement, which the next print command repeats: the report that is open keeps its pages until then.

@@ -74,13 +74,19 @@ void UReportView::forgetPages()
 {
     startLinesLength_ = -1;
     static_cast<ReportViewWidget *>(widget_.data())->forgetPages();
+    OnPagesForgotten();
 }
+
+void UReportView::OnPagesForgotten() {}
+
+void UReportView::OnTextEdited(const ReportChange & /*change*/) {}
 
 void UReportView::followPages(const ReportChange &change)
 {
     auto &widget = *static_cast<ReportViewWidget *>(widget_.data());
     if (!isMirrored_) {
         widget.forgetPages();
+        OnTextEdited(change);
         return;
     }
     const std::vector<qint64> &starts = GetDocument()->GetPageStarts();
@@ -96,6 +102,7 @@ void UReportView::followPages(const ReportChange &change)
         }
     }
     widget.followEdit(change, lines);
+    OnTextEdited(change);
 }
 
 bool UReportView::carryThrough(const ReportChange &change)

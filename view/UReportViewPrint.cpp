@@ -17,6 +17,7 @@
 #include <QPaintEngine>
 #include <QPainter>
 #include <QPrinter>
+#include <QTextBlock>
 #include <QTextDocument>
 
 #include <memory>
@@ -134,6 +135,27 @@ void UReportView::OnReportPrint(bool direct)
     const auto orientation = kareport::reportOrientation();
     PrintInfo info;
     info.direct = direct;
+    print(info);
+}
+
+void UReportView::OnPrintSelection()
+{
+    const QTextCursor cursor = GetEdit().textCursor();
+    if (GetDocument() == nullptr || !cursor.hasSelection()) {
+        return;
+    }
+    measureRoom(*GetDocument()); // another sheet may be chosen
+    const auto orientation = kareport::reportOrientation();
+    const QTextDocument &text = *GetEdit().document();
+    const QTextBlock last = text.findBlock(cursor.selectionEnd());
+    PrintInfo info;
+    info.first = text.findBlock(cursor.selectionStart()).position();
+    info.last = cursor.selectionEnd() > last.position() ? last.position() + last.length() : last.position();
+    print(info);
+}
+
+void UReportView::print(PrintInfo &info)
+{
     if (OnPreparePrinting(info)) {
         const QString name = nameOf(*info.printer);
         const PrintedText text(*this);
@@ -208,7 +230,12 @@ bool UReportView::OnPreparePrinting(PrintInfo &info)
             return false;
         }
     }
-    if (report->IsPageFixed()) {
+    if (info.last >= 0) {
+        const QTextDocument &printed = *GetEdit().document();
+        const int lines = printed.findBlock(static_cast<int>(info.last) - 1).blockNumber() -
+                          printed.findBlock(static_cast<int>(info.first)).blockNumber() + 1;
+        info.maxPage = kareport::expectedPages(lines, report->GetLinesPerPage());
+    } else if (report->IsPageFixed()) {
         prepareRun(info.printer);
         info.maxPage = printsGivenPages() ? static_cast<int>(run_->sheets.size()) : info.maxPage;
     }

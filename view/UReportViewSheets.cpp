@@ -5,12 +5,14 @@
 #include "PrintRun.h"
 #include "ReportEdit.h"
 #include "ReportPages.h"
+#include "ReportViewWidget.h"
 #include "UReportDoc.h"
 
 #include <QPainter>
 #include <QTextBlock>
 #include <QTextDocument>
 
+#include <algorithm>
 #include <memory>
 #include <stdexcept>
 
@@ -18,9 +20,9 @@ using kareport::PrintInfo;
 
 void UReportView::OnBeginPrinting(QPainter &painter, PrintInfo &info)
 {
-    m_aPageStart.assign(1, 0);
+    m_aPageStart.assign(1, info.first);
     prepareRun(painter.device());
-    if (!printsGivenPages()) {
+    if (!printsSheets(info)) {
         return;
     }
     m_aPageStart.clear();
@@ -40,11 +42,9 @@ void UReportView::OnPrepareDC(QPainter &painter, PrintInfo &info)
 {
     // A page may be asked for before the pages in front of it have been printed.
     while (!m_aPageStart.empty() && static_cast<qint64>(m_aPageStart.size()) < info.curPage) {
-        qint64 length = 0;
-        const qint64 next = withPager(*painter.device(), [&](kareport::LinePager &pager) {
-            length = pager.length();
-            return printsGivenPages() ? length : pager.layOut(printableRect(), m_aPageStart.back(), -1);
-        });
+        const qint64 length = endOf(info);
+        const qint64 next =
+            printsSheets(info) ? length : layOutFrom(m_aPageStart.back(), info, *painter.device(), nullptr);
         if (next >= length || next <= m_aPageStart.back()) {
             info.maxPage = static_cast<int>(m_aPageStart.size());
             return;
@@ -60,7 +60,7 @@ void UReportView::OnPrint(QPainter &painter, PrintInfo &info)
         throw std::invalid_argument("the start of the page is not known");
     }
     const auto index = static_cast<std::size_t>(info.curPage) - 1;
-    if (printsGivenPages()) {
+    if (printsSheets(info)) {
         const kareport::PrintSheet sheet = run_->sheets.at(index);
         withPager(*painter.device(), [&](kareport::LinePager &pager) {
             return pager.layOutScaled(printableRect(), sheet.start, sheet.stop, sheet.scale, &painter);
@@ -69,8 +69,8 @@ void UReportView::OnPrint(QPainter &painter, PrintInfo &info)
         return;
     }
     const qint64 start = m_aPageStart[index];
-    const qint64 next = PrintPage(painter, start, -1);
-    if (next >= GetEdit().document()->characterCount() - 1) {
+    const qint64 next = layOutFrom(start, info, *painter.device(), &painter);
+    if (next >= endOf(info)) {
         info.maxPage = info.curPage;
     } else if (info.curPage == pages && next > start) {
         m_aPageStart.push_back(next); // a page that takes nothing would be followed by others without end
@@ -113,24 +113,64 @@ void UReportView::prepareRun(QPaintDevice *device)
 
 std::vector<kareport::PrintSheet> UReportView::givenSheets(kareport::LinePager &pager) const
 {
+    const auto pages = FindGivenPages();
+    return pages ? kareport::printSheets(pager, printableRect(), *pages, GetDocument()->GetLinesPerPage())
+                 : std::vector<kareport::PrintSheet>();
+}
+
+std::optional<std::vector<kareport::ReportPage>> UReportView::FindGivenPages() const
+{
     const UReportDoc *report = GetDocument();
-    if (report == nullptr || !report->IsPageFixed()) {
-        return {};
+    if (report == nullptr || !report->IsPageFixed() || !widget_) {
+        return std::nullopt;
     }
-    // The pages of what is shown: formats and line ends make the places of characters differ from those in the report.
-    const QString shown = pager.text().toPlainText();
+    const auto &widget = *static_cast<const kareport::ReportViewWidget *>(widget_.data());
+    if (!showsFormats_) {
+        return widget.reportPages();
+    }
+    // The pages of what is shown: formats and line ends make the places of characters differ from those in the report. A line
+    // that is broken within a paragraph counts as two.
+    const QTextDocument &document = *GetEdit().document();
+    const QString shown = document.toPlainText();
     std::vector<qint64> starts;
     for (const int line : pageStartLines()) {
-        starts.push_back(pager.text().findBlockByNumber(line).position());
+        starts.push_back(document.findBlockByNumber(line).position());
     }
-    const int lines = report->GetLinesPerPage();
-    return kareport::printSheets(pager, printableRect(), kareport::reportPages(QStringView(shown), starts, lines),
-                                 lines);
+    return kareport::reportPages(QStringView(shown), starts, report->GetLinesPerPage());
 }
 
 bool UReportView::printsGivenPages() const
 {
     return run_ != nullptr && !run_->sheets.empty();
+}
+
+bool UReportView::printsSheets(const PrintInfo &info) const
+{
+    return printsGivenPages() && info.last < 0;
+}
+
+qint64 UReportView::endOf(const PrintInfo &info) const
+{
+    const qint64 length = GetEdit().document()->characterCount() - 1;
+    return info.last < 0 ? length : std::min(info.last, length);
+}
+
+qint64 UReportView::layOutFrom(qint64 start, const PrintInfo &info, QPaintDevice &device, QPainter *painter) const
+{
+    return withPager(device, [&](kareport::LinePager &pager) {
+        // A part of pages that have sheets of their own has the type of these.
+        return printsGivenPages() ? pager.layOutScaled(printableRect(), start, info.last, usualScale(), painter)
+                                  : pager.layOut(printableRect(), start, info.last, painter);
+    });
+}
+
+qreal UReportView::usualScale() const
+{
+    qreal scale = 0;
+    for (const kareport::PrintSheet &sheet : run_->sheets) {
+        scale = std::max(scale, sheet.scale);
+    }
+    return scale;
 }
 
 template <typename Work>
