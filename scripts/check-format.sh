@@ -23,6 +23,6 @@ case "${1:-}" in
         changed=(-newer "$stamp")
     fi ;;
 esac
-find host templates groups page formats report print view ui geometry sources rows exports jobs preview apps tests bench fuzz tools examples \
+find host templates groups page formats report print view ui sheets geometry sources rows exports jobs preview apps tests bench fuzz tools examples \
     "${changed[@]}" \( -name '*.h' -o -name '*.cpp' \) -print0 | xargs -0 -r clang-format "${mode[@]}"
 [ -z "$stamp" ] || mv "$stamp.new" "$stamp"

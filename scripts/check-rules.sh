@@ -10,7 +10,7 @@ report() { # what is wrong, and the lines that grep has found
         failed=1
     fi
 }
-sources=$(find host templates groups page formats report print view ui geometry sources rows exports jobs preview apps tests bench fuzz tools examples -name '*.h' -o -name '*.cpp' | sort)
+sources=$(find host templates groups page formats report print view ui sheets geometry sources rows exports jobs preview apps tests bench fuzz tools examples -name '*.h' -o -name '*.cpp' | sort)
 
 report 'Headers are included by their name alone, so that layers hold:' \
     "$(grep -nE '#include "(\.\./|[a-z]+/)' $sources || true)"

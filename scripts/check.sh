@@ -46,7 +46,7 @@ while [ $# -gt 0 ]; do
 done
 [ ${#steps[@]} -gt 0 ] || steps=(tidy coverage fuzz)
 [ ${#folders[@]} -gt 0 ] ||
-    folders=(host templates groups page formats report print view ui geometry sources rows exports jobs preview apps tools bench examples fuzz tests)
+    folders=(host templates groups page formats report print view ui sheets geometry sources rows exports jobs preview apps tools bench examples fuzz tests)
 
 run_tidy() {
     scripts/packages.sh build test bench tidy || return 1

@@ -14,7 +14,7 @@ import xml.etree.ElementTree as xml
 from xml.sax.saxutils import escape
 
 root = pathlib.Path(__file__).resolve().parent.parent
-folders = ["host", "templates", "groups", "page", "formats", "report", "print", "view", "ui", "sources", "rows", "exports", "jobs", "preview", "apps"]
+folders = ["host", "templates", "groups", "page", "formats", "report", "print", "view", "ui", "sources", "rows", "exports", "jobs", "sheets", "preview", "apps"]
 languages = ["de", "ja"]
 literal = r'"(?:[^"\\\n]|\\.)*"'
 call = re.compile(r'(?:\bXlate\(|\bQT_TRANSLATE_NOOP\(\s*"KaReport"\s*,)\s*((?:' + literal + r'\s*)+)\)')

@@ -436,6 +436,11 @@
     </message>
     <message>
         <location filename="../print/PageSetupForm.cpp"/>
+        <source>Paper: %1 x %2 in</source>
+        <translation>Papier: %1 x %2 Zoll</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
         <source>Paper: %1 x %2 mm</source>
         <translation>Papier: %1 x %2 mm</translation>
     </message>
@@ -513,6 +518,12 @@
         <location filename="../print/PageSetupFormParts.cpp"/>
         <source>Bottom margin</source>
         <translation>Unterer Rand</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source> in</source>
+        <comment>inches, after a number</comment>
+        <translation> in</translation>
     </message>
     <message>
         <location filename="../print/PageSetupFormParts.cpp"/>
@@ -661,6 +672,11 @@
         <location filename="../view/ReportEditCopy.cpp"/>
         <source>There is not enough memory to copy this. The clipboard is as it was.</source>
         <translation>Der Speicher reicht nicht aus, um dies zu kopieren. Die Zwischenablage ist unverändert.</translation>
+    </message>
+    <message>
+        <location filename="../view/ReportEditPageLines.cpp"/>
+        <source>Page %1</source>
+        <translation>Seite %1</translation>
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
@@ -2617,6 +2633,76 @@
         <translation>%1 wurde erwartet, wie die Variable „%2“ es hat</translation>
     </message>
     <message>
+        <location filename="../sheets/PlaceFields.cpp"/>
+        <source>Previous page</source>
+        <translation>Vorige Seite</translation>
+    </message>
+    <message>
+        <location filename="../sheets/PlaceFields.cpp"/>
+        <source>Next page</source>
+        <translation>Nächste Seite</translation>
+    </message>
+    <message>
+        <location filename="../sheets/PlaceFields.cpp"/>
+        <source>Page shown</source>
+        <translation>Angezeigte Seite</translation>
+    </message>
+    <message>
+        <location filename="../sheets/PlaceFields.cpp"/>
+        <source>Smaller</source>
+        <translation>Kleiner</translation>
+    </message>
+    <message>
+        <location filename="../sheets/PlaceFields.cpp"/>
+        <source>Larger</source>
+        <translation>Größer</translation>
+    </message>
+    <message>
+        <location filename="../sheets/PlaceFields.cpp"/>
+        <source>Fit to Width</source>
+        <translation>Auf Breite einpassen</translation>
+    </message>
+    <message>
+        <location filename="../sheets/PlaceFields.cpp"/>
+        <source>Fit to Page</source>
+        <translation>Auf Seite einpassen</translation>
+    </message>
+    <message>
+        <location filename="../sheets/ReportSheets.cpp"/>
+        <source>There is no page to show.</source>
+        <translation>Es gibt keine Seite, die gezeigt werden kann.</translation>
+    </message>
+    <message>
+        <location filename="../sheets/ReportSheets.cpp"/>
+        <source>This report is empty.</source>
+        <translation>Dieser Bericht ist leer.</translation>
+    </message>
+    <message>
+        <location filename="../sheets/ReportSheets.cpp"/>
+        <source>Finding the sheets: %1 %</source>
+        <translation>Die Blätter werden ermittelt: %1 %</translation>
+    </message>
+    <message>
+        <location filename="../sheets/SheetReportView.cpp"/>
+        <source>Sheet</source>
+        <translation>Blatt</translation>
+    </message>
+    <message>
+        <location filename="../sheets/SheetThumbnails.cpp"/>
+        <source>Small pictures of the sheets</source>
+        <translation>Kleine Bilder der Blätter</translation>
+    </message>
+    <message>
+        <location filename="../sheets/SheetThumbnails.cpp"/>
+        <source>Sheet %1 of %2</source>
+        <translation>Blatt %1 von %2</translation>
+    </message>
+    <message>
+        <location filename="../sheets/SheetView.cpp"/>
+        <source>Sheets</source>
+        <translation>Blätter</translation>
+    </message>
+    <message>
         <location filename="../preview/TemplateEdits.cpp"/>
         <source>A name without blanks at its ends was expected.</source>
         <translation>Ein Name ohne Leerzeichen an seinen Enden wurde erwartet.</translation>
@@ -3275,6 +3361,41 @@ Open them again?</source>
 Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/DeskSheets.cpp"/>
+        <source>Print Se&amp;lection...</source>
+        <translation>Aus&amp;wahl drucken...</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskSheets.cpp"/>
+        <source>S&amp;heets	F8</source>
+        <translation>&amp;Blätter	F8</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskSheets.cpp"/>
+        <source>Sheets &amp;Beside the Text	Shift+F8</source>
+        <translation>Blätter neben &amp;dem Text	Shift+F8</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskSheets.cpp"/>
+        <source>Small &amp;Pictures of the Sheets</source>
+        <translation>Kleine B&amp;ilder der Blätter</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskSheets.cpp"/>
+        <source>Page &amp;Lines in the Text</source>
+        <translation>Seiten&amp;linien im Text</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskSheets.cpp"/>
+        <source>Fit to &amp;Width</source>
+        <translation>Auf B&amp;reite einpassen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskSheets.cpp"/>
+        <source>Fit to Pa&amp;ge</source>
+        <translation>Auf S&amp;eite einpassen</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/EditorHold.cpp"/>
         <source>"%1" could not be started. Choose another program under Preferences.</source>
         <translation>„%1“ konnte nicht gestartet werden. In den Einstellungen ein anderes Programm wählen.</translation>
@@ -3511,6 +3632,11 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>Of the printer, else of the country (%1)</source>
+        <translation>Vom Drucker, sonst vom Land (%1)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Preferences</source>
         <translation>Einstellungen</translation>
     </message>
@@ -3528,6 +3654,26 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>&amp;Font size of new reports:</source>
         <translation>Schri&amp;ftgröße neuer Berichte:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>Millimetres</source>
+        <translation>Millimeter</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>Inches</source>
+        <translation>Zoll</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>Unit of margins</source>
+        <translation>Einheit der Ränder</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>Unit of &amp;margins:</source>
+        <translation>Ei&amp;nheit der Ränder:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>

@@ -436,6 +436,11 @@
     </message>
     <message>
         <location filename="../print/PageSetupForm.cpp"/>
+        <source>Paper: %1 x %2 in</source>
+        <translation>用紙: %1 x %2 インチ</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupForm.cpp"/>
         <source>Paper: %1 x %2 mm</source>
         <translation>用紙: %1 x %2 mm</translation>
     </message>
@@ -513,6 +518,12 @@
         <location filename="../print/PageSetupFormParts.cpp"/>
         <source>Bottom margin</source>
         <translation>下余白</translation>
+    </message>
+    <message>
+        <location filename="../print/PageSetupFormParts.cpp"/>
+        <source> in</source>
+        <comment>inches, after a number</comment>
+        <translation> in</translation>
     </message>
     <message>
         <location filename="../print/PageSetupFormParts.cpp"/>
@@ -661,6 +672,11 @@
         <location filename="../view/ReportEditCopy.cpp"/>
         <source>There is not enough memory to copy this. The clipboard is as it was.</source>
         <translation>コピーするメモリが足りません。クリップボードの内容は変わっていません。</translation>
+    </message>
+    <message>
+        <location filename="../view/ReportEditPageLines.cpp"/>
+        <source>Page %1</source>
+        <translation>%1 ページ</translation>
     </message>
     <message>
         <location filename="../view/ReportViewWidget.cpp"/>
@@ -2617,6 +2633,76 @@
         <translation>%1が必要です (変数「%2」の値として)</translation>
     </message>
     <message>
+        <location filename="../sheets/PlaceFields.cpp"/>
+        <source>Previous page</source>
+        <translation>前のページ</translation>
+    </message>
+    <message>
+        <location filename="../sheets/PlaceFields.cpp"/>
+        <source>Next page</source>
+        <translation>次のページ</translation>
+    </message>
+    <message>
+        <location filename="../sheets/PlaceFields.cpp"/>
+        <source>Page shown</source>
+        <translation>表示中のページ</translation>
+    </message>
+    <message>
+        <location filename="../sheets/PlaceFields.cpp"/>
+        <source>Smaller</source>
+        <translation>縮小</translation>
+    </message>
+    <message>
+        <location filename="../sheets/PlaceFields.cpp"/>
+        <source>Larger</source>
+        <translation>拡大</translation>
+    </message>
+    <message>
+        <location filename="../sheets/PlaceFields.cpp"/>
+        <source>Fit to Width</source>
+        <translation>幅に合わせる</translation>
+    </message>
+    <message>
+        <location filename="../sheets/PlaceFields.cpp"/>
+        <source>Fit to Page</source>
+        <translation>ページに合わせる</translation>
+    </message>
+    <message>
+        <location filename="../sheets/ReportSheets.cpp"/>
+        <source>There is no page to show.</source>
+        <translation>表示できるページがありません。</translation>
+    </message>
+    <message>
+        <location filename="../sheets/ReportSheets.cpp"/>
+        <source>This report is empty.</source>
+        <translation>この帳票は空です。</translation>
+    </message>
+    <message>
+        <location filename="../sheets/ReportSheets.cpp"/>
+        <source>Finding the sheets: %1 %</source>
+        <translation>用紙の割り付け: %1 %</translation>
+    </message>
+    <message>
+        <location filename="../sheets/SheetReportView.cpp"/>
+        <source>Sheet</source>
+        <translation>用紙</translation>
+    </message>
+    <message>
+        <location filename="../sheets/SheetThumbnails.cpp"/>
+        <source>Small pictures of the sheets</source>
+        <translation>用紙の縮小画像</translation>
+    </message>
+    <message>
+        <location filename="../sheets/SheetThumbnails.cpp"/>
+        <source>Sheet %1 of %2</source>
+        <translation>用紙 %1 / %2</translation>
+    </message>
+    <message>
+        <location filename="../sheets/SheetView.cpp"/>
+        <source>Sheets</source>
+        <translation>用紙</translation>
+    </message>
+    <message>
         <location filename="../preview/TemplateEdits.cpp"/>
         <source>A name without blanks at its ends was expected.</source>
         <translation>前後に空白のない名前が必要です。</translation>
@@ -3275,6 +3361,41 @@ Open them again?</source>
 もう一度開きますか?</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/DeskSheets.cpp"/>
+        <source>Print Se&amp;lection...</source>
+        <translation>選択範囲を印刷(&amp;L)...</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskSheets.cpp"/>
+        <source>S&amp;heets	F8</source>
+        <translation>用紙(&amp;H)	F8</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskSheets.cpp"/>
+        <source>Sheets &amp;Beside the Text	Shift+F8</source>
+        <translation>テキストの横に用紙(&amp;B)	Shift+F8</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskSheets.cpp"/>
+        <source>Small &amp;Pictures of the Sheets</source>
+        <translation>用紙の縮小画像(&amp;P)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskSheets.cpp"/>
+        <source>Page &amp;Lines in the Text</source>
+        <translation>テキストにページ線(&amp;L)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskSheets.cpp"/>
+        <source>Fit to &amp;Width</source>
+        <translation>幅に合わせる(&amp;W)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskSheets.cpp"/>
+        <source>Fit to Pa&amp;ge</source>
+        <translation>ページに合わせる(&amp;G)</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/EditorHold.cpp"/>
         <source>"%1" could not be started. Choose another program under Preferences.</source>
         <translation>「%1」を起動できませんでした。設定で別のプログラムを選んでください。</translation>
@@ -3511,6 +3632,11 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>Of the printer, else of the country (%1)</source>
+        <translation>プリンターの用紙、なければ国の用紙 (%1)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Preferences</source>
         <translation>設定</translation>
     </message>
@@ -3528,6 +3654,26 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>&amp;Font size of new reports:</source>
         <translation>新しい帳票のフォントサイズ(&amp;F):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>Millimetres</source>
+        <translation>ミリメートル</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>Inches</source>
+        <translation>インチ</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>Unit of margins</source>
+        <translation>余白の単位</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>Unit of &amp;margins:</source>
+        <translation>余白の単位(&amp;M):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>

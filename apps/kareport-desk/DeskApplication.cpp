@@ -3,11 +3,14 @@
 #include "AppMessageBox.h"
 #include "CReportViewPane.h"
 #include "DeskFrame.h"
+#include "DeskPreferences.h"
+#include "DeskSheets.h"
+#include "PageSetupDialog.h"
 #include "PlainWidgets.h"
+#include "PrintDialogs.h"
 #include "Profile.h"
 #include "ReportEntry.h"
 #include "SaveAs.h"
-#include "UReportView.h"
 #include "WorkAside.h"
 
 #include <QFileInfo>
@@ -22,12 +25,14 @@ QString recentEntry(qsizetype number)
 
 } // namespace
 
-DeskApplication::DeskApplication()
+DeskApplication::DeskApplication() : printerBefore_(kareport::defaultPrinter())
 {
+    kareport::usePaper(kareport::loadPreferences());
     AddDocTemplate(kareport::makeReportTemplate([] { return new CReportViewPane; },
                                                 [] {
-                                                    auto view = std::make_unique<UReportView>();
+                                                    auto view = std::make_unique<kareport::SheetReportView>();
                                                     view->SetLoadsInPieces(true);
+                                                    kareport::showAsChosen(*view);
                                                     return view;
                                                 }));
     QStringList files;
@@ -42,6 +47,7 @@ DeskApplication::DeskApplication()
 DeskApplication::~DeskApplication()
 {
     kareport::waitForStoppedWork();
+    kareport::setDefaultPrinter(printerBefore_);
 }
 
 void DeskApplication::AddToRecentFileList(const QString &path)
@@ -65,6 +71,12 @@ namespace kareport
 void installDialogs(QWidget *parent)
 {
     setMessageBox([parent](const Message &message) { return showMessageBox(parent, message); });
+    PrintDialogs printing;
+    printing.pageSetup = [](PageSetup &setup, QWidget *window) {
+        setup.inInches = loadPreferences().inInches;
+        return showPageSetup(setup, window);
+    };
+    setPrintDialogs(printing);
     setSaveDialog([parent](const SaveRequest &request) {
         return askOwnName(request, [parent](const SaveRequest &asked) { return askSavePath(parent, asked); });
     });

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "DefaultPrinter.h"
 #include "UApplication.h"
 
 class QWidget;
@@ -13,6 +14,9 @@ public:
 
     void AddToRecentFileList(const QString &path) override;
     void OnDocumentEvent(UDocument &document, UDocument::DocumentEvent event) override;
+
+private:
+    kareport::DefaultPrinter printerBefore_;
 };
 
 namespace kareport

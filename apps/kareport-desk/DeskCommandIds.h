@@ -12,7 +12,14 @@ enum DeskCommandId : unsigned
     preferencesCommand = 33251,
     nextReportCommand = 33252,
     previousReportCommand = 33253,
-    fileExportCommand = 33254
+    fileExportCommand = 33254,
+    viewSheetsCommand = 33270,
+    viewSheetsBesideCommand = 33271,
+    viewThumbnailsCommand = 33272,
+    viewPageLinesCommand = 33273,
+    fitWidthCommand = 33274,
+    fitPageCommand = 33275,
+    printSelectionCommand = 33276
 };
 
 } // namespace kareport

@@ -1,6 +1,7 @@
 #include "DeskFrame.h"
 
 #include "AppMessageBox.h"
+#include "DeskSheets.h"
 #include "Folders.h"
 #include "JobLauncher.h"
 #include "OpenTemplate.h"
@@ -95,7 +96,12 @@ void DeskFrame::askPreferences()
 {
     kareport::PreferencesDialog dialog(kareport::loadPreferences(), this);
     if (dialog.exec() == QDialog::Accepted) {
+        const kareport::DeskPreferences before = kareport::loadPreferences();
         kareport::savePreferences(dialog.preferences());
+        if (dialog.preferences().paper != before.paper) {
+            kareport::usePaper(dialog.preferences()); // else that of the page set-up stays
+            kareport::restartAllSheets();
+        }
     }
 }
 

@@ -1,6 +1,7 @@
 #include "DeskFrame.h"
 
 #include "DeskCommandIds.h"
+#include "DeskSheets.h"
 #include "PlainWidgets.h"
 #include "ReportMenu.h"
 #include "ReportResources.h"
@@ -14,8 +15,9 @@
 std::vector<kareport::Command> DeskFrame::makeCommands()
 {
     using namespace kareport;
+    std::vector<Command> commands = sheetCommands(*this);
     const auto hasReport = [this](CommandState &state) { state.enabled = GetCommandDocument() != nullptr; };
-    return {
+    const std::vector<Command> own = {
         {fileNewCommand, [this] { newReport(); }, {}},
         {fileOpenCommand, [this] { open(); }, {}},
         {fileFromTemplateCommand, [this] { fromTemplate(QString()); }, {}},
@@ -40,6 +42,8 @@ std::vector<kareport::Command> DeskFrame::makeCommands()
         {helpAboutCommand, [this] { about(); }, {}},
         {helpContentsCommand, [this] { about(); }, {}},
     };
+    commands.insert(commands.begin(), own.begin(), own.end());
+    return commands;
 }
 
 void DeskFrame::makeMenus()
@@ -72,7 +76,7 @@ void DeskFrame::makeMenus()
     menu.edit->addSeparator();
     AddCommand(*menu.edit, preferencesCommand, Xlate("Pr&eferences...\tCtrl+,"));
 
-    menu.view->addSeparator();
+    addSheetMenu(*this, menu);
     AddCommand(*menu.view, zoomInCommand, Xlate("Zoom &In\tCtrl++"));
     AddCommand(*menu.view, zoomOutCommand, Xlate("Zoom &Out\tCtrl+-"));
     AddCommand(*menu.view, zoomResetCommand, Xlate("&Usual Size\tCtrl+0"));

@@ -1,5 +1,7 @@
 #include "DeskPreferences.h"
 
+#include "CountryPaper.h"
+#include "DefaultPrinter.h"
 #include "JobSettings.h"
 #include "PageDefaults.h"
 #include "Preferences.h"
@@ -7,6 +9,8 @@
 #include "ReportMargins.h"
 
 #include <QJsonDocument>
+#include <QLocale>
+#include <QPageSize>
 
 namespace kareport
 {
@@ -17,6 +21,8 @@ namespace
 const QString settingsEntry = QStringLiteral("Job Settings");
 const QString marginsEntry = QStringLiteral("Report Margins");
 const QString keepEntry = QStringLiteral("KeepReportForEditor");
+const QString paperEntry = QStringLiteral("Paper");
+const QString unitEntry = QStringLiteral("Unit of Margins");
 const QString languageEntry = QStringLiteral("Language");
 
 UJobSettings settingsFromText(const QString &text)
@@ -31,6 +37,17 @@ UJobSettings settingsFromText(const QString &text)
     return error ? UJobSettings() : settings;
 }
 
+/// The sheets that are kept, by their names in the profile.
+QSize paperOf(const QString &key)
+{
+    for (const auto id : {QPageSize::A4, QPageSize::A3, QPageSize::Letter, QPageSize::Legal}) {
+        if (QPageSize::key(id) == key) {
+            return QPageSize(id).sizePoints();
+        }
+    }
+    return {};
+}
+
 } // namespace
 
 JobDefaults DeskPreferences::jobDefaults() const
@@ -38,6 +55,9 @@ JobDefaults DeskPreferences::jobDefaults() const
     JobDefaults defaults;
     defaults.settings = settings;
     defaults.page.portrait = portrait;
+    defaults.page.printer.paper = paperOfCountry(QLocale::system());
+    defaults.page.printer.sheet = paper;
+    defaults.page.printer.replacesPrinter = true;
     defaults.page.margins = margins;
     defaults.page.fontSize = static_cast<int>(fontSize);
     return defaults;
@@ -50,6 +70,9 @@ DeskPreferences loadPreferences()
     preferences.fontSize = GetReportFontSize();
     preferences.margins = marginsFromText(GetProfileString(QString(), marginsEntry), defaultMargins);
     preferences.portrait = IsReportPrinterSetToPortrait();
+    preferences.paper = paperOf(GetProfileString(QString(), paperEntry));
+    const QString unit = GetProfileString(QString(), unitEntry);
+    preferences.inInches = unit.isEmpty() ? measuresInInches(QLocale::system()) : unit == u"in";
     preferences.usesEditor = GetUsePreferredReportEditorFlag() != 0;
     preferences.editor = GetProfileString(QString(), GetPreferredReportEditorRegKey());
     preferences.keepsForEditor = GetProfileString(QString(), keepEntry) != u"0";
@@ -65,10 +88,22 @@ void savePreferences(const DeskPreferences &preferences)
     SetReportFontSize(preferences.fontSize);
     WriteProfileString(QString(), marginsEntry, marginsToText(preferences.margins));
     SetReportPrinterSetToPortrait(preferences.portrait);
+    WriteProfileString(QString(), paperEntry,
+                       preferences.paper.isEmpty() ? QString() : QPageSize(preferences.paper).key());
+    WriteProfileString(QString(), unitEntry, preferences.inInches ? QStringLiteral("in") : QStringLiteral("mm"));
     SetUsePreferredReportEditorFlag(preferences.usesEditor);
     WriteProfileString(QString(), GetPreferredReportEditorRegKey(), preferences.editor);
     WriteProfileString(QString(), keepEntry, preferences.keepsForEditor ? QStringLiteral("1") : QStringLiteral("0"));
     WriteProfileString(QString(), languageEntry, preferences.language);
+}
+
+void usePaper(const DeskPreferences &preferences)
+{
+    DefaultPrinter printer = defaultPrinter();
+    printer.paper = paperOfCountry(QLocale::system());
+    printer.sheet = preferences.paper;
+    printer.replacesPrinter = true;
+    setDefaultPrinter(printer);
 }
 
 } // namespace kareport

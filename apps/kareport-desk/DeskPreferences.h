@@ -4,6 +4,7 @@
 #include "UJobSettings.h"
 
 #include <QMargins>
+#include <QSize>
 #include <QString>
 
 namespace kareport
@@ -16,6 +17,8 @@ struct DeskPreferences
     unsigned fontSize = 8; ///< points
     QMargins margins;      ///< hundredths of a millimetre
     bool portrait = true;
+    QSize paper;           ///< upright, in points; empty for the country's, or the printer's own
+    bool inInches = false; ///< whether margins are shown in inches
     bool usesEditor = false;
     QString editor;             ///< full path
     bool keepsForEditor = true; ///< a report cannot be closed while the editor is open
@@ -28,5 +31,8 @@ struct DeskPreferences
 /// Reads the preferences from the user's profile. An entry that cannot be understood counts as not chosen.
 DeskPreferences loadPreferences();
 void savePreferences(const DeskPreferences &preferences);
+/// Makes the chosen paper that of the reports that are made, measured and printed from now on. Where no printer is installed they
+/// are printed into a PDF.
+void usePaper(const DeskPreferences &preferences);
 
 } // namespace kareport

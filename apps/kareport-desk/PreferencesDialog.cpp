@@ -1,6 +1,8 @@
 #include "PreferencesDialog.h"
 
+#include "DefaultPrinter.h"
 #include "EditorPage.h"
+#include "PageMeasurement.h"
 #include "PageSetupForm.h"
 #include "ReportPrinter.h"
 #include "UnitsPage.h"
@@ -9,9 +11,12 @@
 #include <QComboBox>
 #include <QDialogButtonBox>
 #include <QFormLayout>
+#include <QPageSize>
 #include <QSpinBox>
 #include <QTabWidget>
 #include <QVBoxLayout>
+
+#include <algorithm>
 
 namespace kareport
 {
@@ -24,9 +29,20 @@ constexpr int mostFontSize = 72;
 
 PageSetupForm *makePageForm(const DeskPreferences &preferences)
 {
+    // A printer is chosen when a report is printed.
     PageSetup setup;
-    fillPrinters(setup);
-    setup.printers.clear(); // a printer is chosen when a report is printed
+    setup.sheetsOf = [](const QString &) {
+        DefaultPrinter own = defaultPrinter();
+        own.sheet = QSize();
+        const QPageSize usual = builtInSheet(own);
+        std::vector<PageSheet> sheets = usualSheets(usual);
+        sheets.push_back(sheets.front());
+        sheets.front().name = Xlate("Of the printer, else of the country (%1)").arg(usual.name());
+        std::rotate(sheets.begin() + 1, sheets.end() - 1, sheets.end());
+        return sheets;
+    };
+    setup.sheet = preferences.paper;
+    setup.inInches = preferences.inInches;
     setup.margins = preferences.margins;
     setup.portrait = preferences.portrait;
     return new PageSetupForm(setup);
@@ -39,6 +55,7 @@ PreferencesDialog::PreferencesDialog(const DeskPreferences &preferences, QWidget
       tabs_(new QTabWidget),
       units_(new UnitsPage(preferences.settings)),
       fontSize_(new QSpinBox),
+      unit_(new QComboBox),
       page_(makePageForm(preferences)),
       editor_(new EditorPage(preferences.usesEditor, preferences.editor, preferences.keepsForEditor)),
       language_(new QComboBox)
@@ -55,6 +72,13 @@ PreferencesDialog::PreferencesDialog(const DeskPreferences &preferences, QWidget
     auto *fontRow = new QFormLayout;
     fontRow->setFieldGrowthPolicy(QFormLayout::FieldsStayAtSizeHint);
     fontRow->addRow(Xlate("&Font size of new reports:"), fontSize_);
+    unit_->addItem(Xlate("Millimetres"), false);
+    unit_->addItem(Xlate("Inches"), true);
+    unit_->setCurrentIndex(preferences.inInches ? 1 : 0);
+    unit_->setAccessibleName(Xlate("Unit of margins"));
+    connect(unit_, &QComboBox::currentIndexChanged, page_,
+            [this] { page_->showInInches(unit_->currentData().toBool()); });
+    fontRow->addRow(Xlate("Unit of &margins:"), unit_);
     pageLayout->addLayout(fontRow);
     pageLayout->addWidget(page_);
     pageLayout->addStretch();
@@ -91,6 +115,8 @@ DeskPreferences PreferencesDialog::preferences() const
     const PageSetup page = page_->setup();
     preferences.margins = page.margins;
     preferences.portrait = page.portrait;
+    preferences.paper = page.sheet;
+    preferences.inInches = page.inInches;
     preferences.usesEditor = editor_->usesEditor();
     preferences.editor = editor_->editor();
     preferences.keepsForEditor = editor_->keepsReports();

@@ -28,6 +28,7 @@ private:
     QTabWidget *tabs_;
     UnitsPage *units_;
     QSpinBox *fontSize_;
+    QComboBox *unit_;
     PageSetupForm *page_;
     EditorPage *editor_;
     QComboBox *language_;

@@ -55,6 +55,8 @@ DeskPreferences unusualPreferences()
     preferences.fontSize = 11;
     preferences.margins = QMargins(501, 602, 703, 804);
     preferences.portrait = false;
+    preferences.paper = QSize(842, 1191); // A3
+    preferences.inInches = true;
     preferences.usesEditor = false;
     preferences.editor = QStringLiteral("/opt/no such/editor");
     preferences.language = QStringLiteral("ja");
@@ -70,6 +72,8 @@ void expectSame(const DeskPreferences &a, const DeskPreferences &b)
     EXPECT_EQ(a.fontSize, b.fontSize);
     EXPECT_EQ(a.margins, b.margins);
     EXPECT_EQ(a.portrait, b.portrait);
+    EXPECT_EQ(a.paper, b.paper);
+    EXPECT_EQ(a.inInches, b.inInches);
     EXPECT_EQ(a.usesEditor, b.usesEditor);
     EXPECT_EQ(a.editor, b.editor);
     EXPECT_EQ(a.language, b.language);
@@ -87,6 +91,24 @@ TEST_F(PreferencesDialogs, WhatIsNotTouchedStays)
         const PreferencesDialog dialog(preferences);
         expectSame(dialog.preferences(), preferences);
     }
+}
+
+TEST_F(PreferencesDialogs, PaperAndUnitOfMarginsAreChosen)
+{
+    DeskPreferences preferences;
+    preferences.margins = QMargins(2540, 1000, 1000, 1000);
+    PreferencesDialog dialog(preferences);
+    const auto *left = control<QDoubleSpinBox>(dialog, "Left margin");
+    EXPECT_EQ(left->text(), QStringLiteral("25.40 mm"));
+    control<QComboBox>(dialog, "Unit of margins")->setCurrentIndex(1);
+    EXPECT_EQ(left->text(), QStringLiteral("1.000 in"));
+    auto *paper = control<QComboBox>(dialog, "Paper");
+    EXPECT_EQ(paper->currentIndex(), 0) << "the country's";
+    EXPECT_EQ(paper->count(), 5) << "and four that are always the same";
+    paper->setCurrentText(QStringLiteral("A4"));
+    EXPECT_EQ(dialog.preferences().paper, QSize(595, 842)) << "also where it is the country's";
+    EXPECT_TRUE(dialog.preferences().inInches);
+    EXPECT_EQ(dialog.preferences().margins, preferences.margins);
 }
 
 TEST_F(PreferencesDialogs, SamplesFollowTheChoices)
