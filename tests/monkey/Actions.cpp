@@ -10,6 +10,7 @@
 #include "PaneDock.h"
 #include "ReportEdit.h"
 #include "ReportResources.h"
+#include "SheetColumn.h"
 #include "TemplateTextEdit.h"
 #include "TemplateWindow.h"
 #include "UReportDoc.h"
@@ -219,6 +220,29 @@ void clickText(World & /*world*/, Chance &chance)
         QTest::mouseClick(text, Qt::LeftButton, Qt::NoModifier,
                           QPoint(chance.below(qMax(1, text->width())), chance.below(qMax(1, text->height()))));
     }
+}
+
+void clickSheet(World & /*world*/, Chance &chance)
+{
+    QList<kareport::SheetColumn *> columns;
+    for (UReportView *view : World::viewsOnScreen()) {
+        for (auto *area : view->GetWidget()->findChildren<QAbstractScrollArea *>()) {
+            auto *column = dynamic_cast<kareport::SheetColumn *>(area);
+            if (column != nullptr && column->isVisible()) {
+                columns.append(column);
+            }
+        }
+    }
+    if (!columns.isEmpty()) {
+        QWidget *sheets = chance.of(columns)->viewport();
+        QTest::mouseClick(sheets, Qt::LeftButton, chance.oneIn(3) ? Qt::ShiftModifier : Qt::NoModifier,
+                          QPoint(chance.below(qMax(1, sheets->width())), chance.below(qMax(1, sheets->height()))));
+    }
+}
+
+void showSheets(World &world, Chance &chance)
+{
+    runCommand(world, chance.oneIn(2) ? kareport::viewSheetsCommand : kareport::viewSheetsBesideCommand);
 }
 
 QList<QDockWidget *> shownDocks(const World &world)
@@ -440,6 +464,8 @@ const std::vector<Action> &allActions()
         {"drop", 2, false, dropFile},
         {"tab", 8, false, clickTab},
         {"click", 6, false, clickText},
+        {"click-sheet", 3, false, clickSheet},
+        {"sheets", 2, false, showSheets},
         {"float", 2, false, floatPane},
         {"drag", 2, false, dragPane},
         {"close-pane", 5, false, closePane},

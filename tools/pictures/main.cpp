@@ -10,8 +10,10 @@
 #include "PreferencesDialog.h"
 #include "PrintProgress.h"
 #include "Profile.h"
+#include "ReportEdit.h"
 #include "ReportPrinter.h"
 #include "ReportViewWidget.h"
+#include "SheetReportView.h"
 #include "TemplateDialog.h"
 #include "TemplateFindBar.h"
 #include "TemplatePage.h"
@@ -29,6 +31,7 @@
 #include <QLineEdit>
 #include <QMenu>
 #include <QMenuBar>
+#include <QScrollBar>
 #include <QStyleFactory>
 #include <QTabWidget>
 #include <QTimer>
@@ -83,6 +86,31 @@ private:
     bool isWritten_ = true;
 };
 
+void takeSheets(Pictures &pictures, DeskFrame &frame)
+{
+    auto *view = dynamic_cast<kareport::SheetReportView *>(frame.GetActiveView());
+    if (view == nullptr) {
+        return;
+    }
+    frame.OnCommand(kareport::viewPageLinesCommand);
+    auto &window = *dynamic_cast<kareport::ReportViewWidget *>(view->GetWidget());
+    window.goToPage(2);
+    view->GetEdit().verticalScrollBar()->setValue(view->GetEdit().verticalScrollBar()->value() - 12);
+    pictures.take(frame, "desk-page-lines");
+    frame.OnCommand(kareport::viewPageLinesCommand);
+    frame.OnCommand(kareport::viewSheetsBesideCommand);
+    pictures.take(frame, "desk-sheets");
+    frame.OnCommand(kareport::viewSheetsCommand);
+    window.openFindBar();
+    window.findBar().field().setText(QStringLiteral("12"));
+    pictures.take(frame, "desk-sheets-alone");
+    window.findBar().close();
+    frame.OnCommand(kareport::fitPageCommand);
+    pictures.take(frame, "desk-sheets-page");
+    frame.OnCommand(kareport::viewSheetsCommand);
+    window.goToPage(1);
+}
+
 void takeDesk(Pictures &pictures, const QString &examples)
 {
     DeskApplication application;
@@ -114,6 +142,7 @@ void takeDesk(Pictures &pictures, const QString &examples)
         pictures.take(frame, "desk-page");
         window.pageBar().close();
     }
+    takeSheets(pictures, frame);
     frame.OnCommand(kareport::windowNewCommand);
     frame.OnCommand(kareport::windowTileVerticallyCommand);
     pictures.take(frame, "desk-tiled");
