@@ -415,7 +415,7 @@ void failEditor(World &world, Chance & /*chance*/)
 void editTemplate(World &world, Chance &chance)
 {
     static const QStringList pieces = {QStringLiteral("<"),     QStringLiteral("</Field>"), QStringLiteral("x"),
-                                       QStringLiteral("RIGHT"), QStringLiteral("<Field>"),  QStringLiteral("\n")};
+                                       QStringLiteral("RIGHT"), QStringLiteral("<Field>"),  QStringLiteral("\t")};
     const QString path = world.folder().filePath(QStringLiteral("edited.xml"));
     if (QFile file(path); !file.exists() && file.open(QIODevice::WriteOnly)) {
         file.write("<ReportTemplate>\n\t<Name>T</Name>\n\t<Title>Title</Title>\n</ReportTemplate>\n");
