@@ -3,6 +3,7 @@
 #include "DataColumns.h"
 #include "DataText.h"
 #include "ValueKind.h"
+#include "Xlate.h"
 
 #include <algorithm>
 #include <cmath>
@@ -34,7 +35,7 @@ void CsvResult::addRow(const ResultRow &row)
         out().append(i == 0 ? 0U : 1U, options_.delimiter);
         const ResultCell &cell = row.cells[places_[i]];
         if (options_.values == ResultValues::Printed) {
-            appendText(cell.text);
+            appendDataText(cell.text);
         } else {
             appendValue(columns_[i], cell);
         }
@@ -66,10 +67,28 @@ void CsvResult::appendValue(const ResultColumn &column, const ResultCell &cell)
         }
         break;
     }
-    case ValueKind::Text: appendText(*static_cast<const QString *>(value)); break;
-    case ValueKind::PointNumber: appendText(static_cast<const UPointNumber *>(value)->Convert()); break;
+    case ValueKind::Text: appendDataText(*static_cast<const QString *>(value)); break;
+    case ValueKind::PointNumber: appendDataText(static_cast<const UPointNumber *>(value)->Convert()); break;
     case ValueKind::None: break;
     }
+}
+
+/// Appends a text of the data, and counts those that a spreadsheet program takes for formulas.
+void CsvResult::appendDataText(QStringView text)
+{
+    formulas_ += text.startsWith(u'=') || text.startsWith(u'@') ? 1U : 0U;
+    appendText(text);
+}
+
+QStringList CsvResult::warnings() const
+{
+    QStringList warnings;
+    if (formulas_ > 0) {
+        warnings.append(Xlate("%1 texts begin with = or @: a spreadsheet program that opens the file takes them for "
+                              "formulas")
+                            .arg(formulas_));
+    }
+    return warnings;
 }
 
 /// A text in quotes where it needs them. Each of the quotes that it has is then doubled.

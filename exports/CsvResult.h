@@ -17,14 +17,17 @@ public:
     void addRow(const ResultRow &row) override;
     void endTable() override {}
     void addText(ResultText /*kind*/, QStringView /*text*/, int /*style*/) override {}
+    QStringList warnings() const override;
 
 private:
     void appendValue(const ResultColumn &column, const ResultCell &cell);
     void appendText(QStringView text);
+    void appendDataText(QStringView text);
 
     ResultOptions options_;
     std::vector<ResultColumn> columns_;
     std::vector<std::size_t> places_; ///< of the columns in the table
+    quint64 formulas_ = 0;            ///< texts that other programs take for such
 };
 
 } // namespace kareport

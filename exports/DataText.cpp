@@ -25,13 +25,28 @@ std::ptrdiff_t lengthOf(double number)
     return std::to_chars(std::begin(text), std::end(text), number, std::chars_format::scientific).ptr - text;
 }
 
+/// A text with U+FFFD in the place of each half of a surrogate pair.
+QString withoutHalves(QStringView text)
+{
+    QString whole = text.toString();
+    for (qsizetype i = 0; i < whole.size(); ++i) {
+        const bool isPair = whole[i].isHighSurrogate() && i + 1 < whole.size() && whole[i + 1].isLowSurrogate();
+        if (isPair) {
+            ++i;
+        } else if (whole[i].isSurrogate()) {
+            whole[i] = QChar::ReplacementCharacter;
+        }
+    }
+    return whole;
+}
+
 } // namespace
 
 void appendUtf8(std::string &out, QStringView text)
 {
     const bool isAscii = std::all_of(text.begin(), text.end(), [](QChar character) { return character < u'\x80'; });
     if (!isAscii) {
-        const QByteArray bytes = text.toUtf8();
+        const QByteArray bytes = text.isValidUtf16() ? text.toUtf8() : withoutHalves(text).toUtf8();
         out.append(bytes.constData(), static_cast<std::size_t>(bytes.size()));
         return;
     }

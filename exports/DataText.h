@@ -9,7 +9,7 @@
 namespace kareport
 {
 
-/// Appends a text in UTF-8. Half of a surrogate pair becomes a question mark.
+/// Appends a text in UTF-8. Half of a surrogate pair becomes U+FFFD.
 void appendUtf8(std::string &out, QStringView text);
 
 /// The number of the data that becomes an internal value by a factor: the very number that was read, where there is one.

@@ -27,7 +27,7 @@ thead th{background:var(--band);border-bottom:2px solid var(--line);position:sti
 .n,.r{text-align:right}
 .c{text-align:center}
 td.n{font-family:ui-monospace,"DejaVu Sans Mono","Liberation Mono",Consolas,monospace;font-size:.93em;white-space:pre}
-tbody.g th{background:var(--band);padding-top:.6rem}
+tr.g th{background:var(--band);padding-top:.6rem}
 tbody.t td{border-top:1px solid currentColor;font-weight:bold}
 thead [role=button]{cursor:pointer}
 thead [role=button]:focus-visible{outline:2px solid currentColor;outline-offset:2px}
@@ -40,7 +40,7 @@ nav{display:none}
 thead{display:table-header-group}
 thead th{position:static}
 tr{break-inside:avoid}
-h2,tbody.g{break-after:avoid}
+h2,tr.g{break-after:avoid}
 tbody.t{break-before:avoid}
 th[aria-sort] span::after{content:""}
 }
@@ -68,13 +68,15 @@ for (const table of document.querySelectorAll('table.data')) {
       const keyOf = row => {
         const cell = row.cells[column];
         if (!isNumber) return cell.textContent;
-        const number = parseFloat(cell.dataset.v ?? cell.textContent);
+        const text = cell.dataset.v ?? cell.textContent.trim();
+        if (/^-?inf/i.test(text)) return text[0] === '-' ? -Infinity : Infinity;
+        const number = parseFloat(text);
         return isNaN(number) ? -Infinity : number;
       };
       const text = new Intl.Collator(undefined, {numeric: true});
       const compare = isNumber ? (a, b) => a < b ? -1 : a > b ? 1 : 0 : text.compare;
       for (const body of table.querySelectorAll('tbody.d')) {
-        const rows = [...body.rows].map(row => [keyOf(row), row]);
+        const rows = [...body.rows].filter(row => !row.classList.contains('g')).map(row => [keyOf(row), row]);
         rows.sort((a, b) => falls ? compare(b[0], a[0]) : compare(a[0], b[0]));
         body.append(...rows.map(row => row[1]));
       }

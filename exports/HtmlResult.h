@@ -6,6 +6,9 @@
 
 #include <QString>
 
+#include <string>
+#include <vector>
+
 namespace kareport
 {
 
@@ -19,6 +22,8 @@ public:
 
     /// The name of a page, from 1: "points.html", "points-2.html", ...
     static QString pageName(const QString &fileName, std::size_t page);
+    /// Whether a file is a further page of a first page. @param bytes  that it begins with, up to its first table
+    static bool isPage(const QByteArray &bytes, const QString &fileName, std::size_t page);
 
     void beginReport(const ResultReport &report) override;
     bool beginTable(const ResultTable &table) override;
@@ -44,7 +49,10 @@ private:
     void beginPage();
     void endPage(bool isLast);
     void turnFullPage();
-    void writeTableHead();
+    void openTable();
+    void addTableText(ResultText kind, QStringView text, int level);
+    void writeHeading(const std::string &escaped);
+    void writeAcross(const char *opening, const std::string &escaped);
     void beginBody(char kind);
     void endBody();
     void writeBlock(const ResultRow &row);
@@ -58,7 +66,10 @@ private:
     std::vector<Column> columns_;
     std::string label_; ///< of the table, escaped
     bool isTable_ = false;
-    char body_ = 0; ///< what the open part of a table is: rows of data, the heading of a group or totals; 0 for none
+    bool isHeadPending_ = false;        ///< the heading of the table is not written yet
+    std::vector<std::string> headings_; ///< of the groups that the next row is in, by their levels; escaped
+    char body_ = 0;                     ///< what the open part of a table is: rows of data or totals; 0 for none
+    bool bodyHasRows_ = false;          ///< and not headings of groups alone
     int rowsOnPage_ = 0;
     bool hasPage_ = false;
 };

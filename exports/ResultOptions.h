@@ -33,6 +33,7 @@ struct ResultOptions
 
     bool isOneSheet = false;    ///< of a workbook: all in one sheet, not a sheet for each table
     bool bearingValues = false; ///< of a workbook: a column with the degrees of each bearing beside its text
+    bool formulas = false;      ///< of a workbook: totals are formulas where these show the same digits
 };
 
 } // namespace kareport

@@ -82,6 +82,12 @@ std::string sheetFormat(const ResultColumn &column, const UJobSettings &settings
     return plain;
 }
 
+std::optional<SheetNumber> blankNumber(const ResultColumn &column, const ResultCell &cell, const UJobSettings &settings)
+{
+    const auto number = shownNumber(column, cell, settings);
+    return number ? std::optional(SheetNumber{*number, ";;;"}) : std::nullopt;
+}
+
 std::optional<SheetNumber> sheetNumber(const ResultColumn &column, const ResultCell &cell, const UJobSettings &settings,
                                        ResultValues values)
 {
@@ -97,13 +103,21 @@ std::optional<SheetNumber> sheetNumber(const ResultColumn &column, const ResultC
     if (values == ResultValues::Exact) {
         number.value = shownNumber(column, cell, settings).value_or(printed->value);
     }
-    // The sign of a zero, and the side of an offset of zero, are in no number: their format has them.
+    if (!printed->isZero) {
+        return number;
+    }
+    // The sign of a zero, and the side of an offset of zero, are in no number: their format has them. What is rounded to zero
+    // would show a sign that the report does not show.
     const std::string plain = plainFormat(shownDecimals(column, settings));
-    const std::string quotedSide = printed->side != 0 ? std::string("\"") + printed->side + '"' : std::string();
-    if (printed->isZero && printed->isMinus) {
-        number = {0, "\"-\"" + (column.field.Type == VARIABLE_OFFSET ? plain : sheetFormat(column, settings))};
-    } else if (printed->isZero && hasSideLetter(column)) {
-        number = {0, plain + quotedSide};
+    if (printed->isMinus) {
+        number.format = "\"-\"" + (column.field.Type == VARIABLE_OFFSET ? plain : sheetFormat(column, settings));
+    } else if (hasSideLetter(column)) {
+        number.format = plain + (printed->side != 0 ? std::string("\"") + printed->side + '"' : std::string());
+    } else if (number.value < 0) {
+        number.format = column.field.Type == VARIABLE_OFFSET ? '+' + plain : sheetFormat(column, settings);
+    }
+    if (number.value < 0) {
+        number.format += ';' + number.format; // as it is, without the sign of a single format
     }
     return number;
 }

@@ -24,4 +24,8 @@ std::string sheetFormat(const ResultColumn &column, const UJobSettings &settings
 std::optional<SheetNumber> sheetNumber(const ResultColumn &column, const ResultCell &cell, const UJobSettings &settings,
                                        ResultValues values);
 
+/// The number of a cell that the report leaves blank, with a format that shows nothing. Nothing for what is missing.
+std::optional<SheetNumber> blankNumber(const ResultColumn &column, const ResultCell &cell,
+                                       const UJobSettings &settings);
+
 } // namespace kareport

@@ -4,7 +4,10 @@
 #include "SystemPath.h"
 #include "Xlate.h"
 
+#include <algorithm>
+#include <cerrno>
 #include <clocale>
+#include <cstdio>
 #include <new>
 #include <utility>
 
@@ -15,6 +18,7 @@ namespace
 {
 
 constexpr qsizetype mostCharacters = 32'767; ///< of a cell
+constexpr qsizetype escapeLength = 7;        ///< of _x0041_
 
 int openBooks = 0;
 
@@ -60,22 +64,29 @@ void setAlign(lxw_format *format, CellLook::Align align)
 
 } // namespace
 
-void appendSheetText(std::string &out, QStringView text)
+qsizetype appendSheetText(std::string &out, QStringView text, qsizetype most)
 {
     qsizetype start = 0;
-    for (qsizetype i = 0; i < text.size(); ++i) {
+    qsizetype i = 0;
+    for (qsizetype count = 0; i < text.size(); ++i) {
         const char16_t character = text[i].unicode();
         const char *instead = character == u'_' && isEscape(text, i)                         ? "_x005F_"
                               : character == 0xFFFE || character == 0xFFFF || character == 0 ? "\xEF\xBF\xBD"
                               : character == u'\r'                                           ? "_x000D_"
                                                                                              : nullptr;
+        count += instead != nullptr && *instead == '_' ? escapeLength : 1;
+        const bool isPair = text[i].isHighSurrogate() && i + 1 < text.size();
+        if (count > most || (isPair && count == most)) {
+            break;
+        }
         if (instead != nullptr) {
             appendUtf8(out, text.sliced(start, i - start));
             out += instead;
             start = i + 1;
         }
     }
-    appendUtf8(out, text.sliced(start));
+    appendUtf8(out, text.sliced(start, i - start));
+    return i;
 }
 
 XlsxBook::PlainNumbers::PlainNumbers()
@@ -111,7 +122,8 @@ XlsxBook::~XlsxBook()
 
 lxw_worksheet *XlsxBook::addSheet(const QString &wantedName)
 {
-    return notNull(workbook_add_worksheet(book_, names_.add(wantedName).toUtf8().constData()));
+    sheets_.push_back(notNull(workbook_add_worksheet(book_, names_.add(wantedName).toUtf8().constData())));
+    return sheets_.back();
 }
 
 lxw_format *XlsxBook::formatOf(const CellLook &look)
@@ -146,17 +158,15 @@ void XlsxBook::setProperties(lxw_doc_properties properties)
 
 void XlsxBook::writeText(lxw_worksheet *sheet, lxw_row_t row, lxw_col_t column, QStringView text, lxw_format *format)
 {
-    if (text.size() > mostCharacters) {
-        text = text.left(mostCharacters);
-        ++cutTexts_;
-    }
     text_.clear();
-    appendSheetText(text_, text);
-    const lxw_error error = worksheet_write_string(sheet, row, column, text_.c_str(), format);
-    if (error == LXW_ERROR_MAX_STRING_LENGTH_EXCEEDED) { // escapes count as well
-        worksheet_write_string(sheet, row, column, text.left(mostCharacters / 8).toUtf8().constData(), format);
-        ++cutTexts_;
-    }
+    cutTexts_ += appendSheetText(text_, text, mostCharacters) < text.size() ? 1U : 0U;
+    worksheet_write_string(sheet, row, column, text_.c_str(), format);
+}
+
+void XlsxBook::writeFormula(lxw_worksheet *sheet, lxw_row_t row, lxw_col_t column, const std::string &formula,
+                            double value, lxw_format *format)
+{
+    worksheet_write_formula_num(sheet, row, column, formula.c_str(), format, value);
 }
 
 void XlsxBook::writeNumber(lxw_worksheet *sheet, lxw_row_t row, lxw_col_t column, double number, lxw_format *format)
@@ -164,8 +174,20 @@ void XlsxBook::writeNumber(lxw_worksheet *sheet, lxw_row_t row, lxw_col_t column
     worksheet_write_number(sheet, row, column, number, format);
 }
 
+/// Whether the system took all rows: the library keeps those of each sheet in a file, and does not ask.
+bool XlsxBook::areRowsWritten() const
+{
+    return std::all_of(sheets_.begin(), sheets_.end(), [](const lxw_worksheet *sheet) {
+        FILE *const rows = sheet->optimize_tmpfile;
+        return rows == nullptr || (std::fflush(rows) == 0 && std::ferror(rows) == 0);
+    });
+}
+
 QString XlsxBook::close()
 {
+    if (!areRowsWritten()) {
+        return Xlate("the workbook could not be put together: %1").arg(qt_error_string(errno));
+    }
     const lxw_error error = workbook_close(std::exchange(book_, nullptr));
     if (error == LXW_ERROR_MEMORY_MALLOC_FAILED) {
         throw std::bad_alloc();

@@ -12,6 +12,7 @@
 #include <map>
 #include <memory>
 #include <string>
+#include <vector>
 
 namespace kareport
 {
@@ -56,6 +57,9 @@ public:
 
     // Cells of a sheet, row after row.
     void writeText(lxw_worksheet *sheet, lxw_row_t row, lxw_col_t column, QStringView text, lxw_format *format);
+    /// @param value  what the formula gives
+    static void writeFormula(lxw_worksheet *sheet, lxw_row_t row, lxw_col_t column, const std::string &formula,
+                             double value, lxw_format *format);
     static void writeNumber(lxw_worksheet *sheet, lxw_row_t row, lxw_col_t column, double number, lxw_format *format);
 
     /// How many texts were longer than a cell holds, and are cut.
@@ -76,17 +80,21 @@ private:
         PlainNumbers &operator=(const PlainNumbers &) = delete;
     };
 
+    bool areRowsWritten() const;
+
     PlainNumbers plainNumbers_;
     QTemporaryDir folder_;
     QByteArray folderName_;
     lxw_workbook *book_ = nullptr;
     SheetNames names_;
     std::map<CellLook, lxw_format *> formats_;
+    std::vector<lxw_worksheet *> sheets_;
     std::string text_; ///< reused from cell to cell
     quint64 cutTexts_ = 0;
 };
 
 /// A text as the cells of a workbook hold it: "_x0041_" would be read as "A", and some characters stand in no file.
-void appendSheetText(std::string &out, QStringView text);
+/// @param most  characters that there may be, with all escapes @return how many characters of the text are in it
+qsizetype appendSheetText(std::string &out, QStringView text, qsizetype most);
 
 } // namespace kareport

@@ -6,6 +6,7 @@
 #include <cstdlib>
 #include <limits>
 #include <string_view>
+#include <system_error>
 
 namespace kareport
 {
@@ -15,7 +16,8 @@ namespace
 
 constexpr std::array<double, 23> powersOfTen = {1e0,  1e1,  1e2,  1e3,  1e4,  1e5,  1e6,  1e7,  1e8,  1e9,  1e10, 1e11,
                                                 1e12, 1e13, 1e14, 1e15, 1e16, 1e17, 1e18, 1e19, 1e20, 1e21, 1e22};
-constexpr int digitsOfDouble = 15; ///< a decimal of so many comes back from a double
+constexpr int digitsOfDouble = 15;                ///< a decimal of so many comes back from a double
+constexpr qint64 digitsOfParts = 100'000'000'000; ///< degrees of fewer digits were written as such
 
 /// The number of a text in scientific notation, without zeros at the end of its digits.
 CellDecimal parse(std::string_view text)
@@ -64,6 +66,23 @@ CellDecimal safeDigits(double value)
     return parse({text.data(), static_cast<std::size_t>(end - text.data())});
 }
 
+/// What reading degrees, minutes and seconds gives. @param count  of seconds, in parts of which a second has `power`
+double degreesOf(qint64 count, qint64 power)
+{
+    const qint64 minutes = count / (60 * power);
+    const double seconds = static_cast<double>(count % (60 * power)) / static_cast<double>(power);
+    return static_cast<double>(minutes / 60) + static_cast<double>(minutes % 60) / 60 +
+           seconds / CellReader::secondsOfDegree;
+}
+
+/// The same of degrees, and minutes with decimals.
+double degreesInMinutes(qint64 count, qint64 power)
+{
+    const qint64 degree = CellReader::secondsOfDegree * power;
+    return static_cast<double>(count / degree) +
+           static_cast<double>(count % degree) / static_cast<double>(60 * power) / 60;
+}
+
 } // namespace
 
 double CellDecimal::toDouble() const
@@ -80,8 +99,18 @@ double CellDecimal::toDouble() const
     *at++ = 'e';
     at = std::to_chars(at, text.data() + text.size(), exponent).ptr;
     double number = 0;
-    std::from_chars(text.data(), at, number);
-    return number;
+    const bool isOutOfRange = std::from_chars(text.data(), at, number).ec == std::errc::result_out_of_range;
+    if (isOutOfRange && exponent > 0) {
+        return digits < 0 ? -std::numeric_limits<double>::infinity() : std::numeric_limits<double>::infinity();
+    }
+    return isOutOfRange ? 0 : number;
+}
+
+/// How many decimals are tried before all else: so few that degrees with them are none of minutes and seconds.
+int CellReader::mostDecimals() const
+{
+    constexpr int decimalsOfDegrees = 9;
+    return perUnit_ == 1 ? digitsOfDouble : decimalsOfDegrees;
 }
 
 CellDecimal CellReader::readSlowly(double value)
@@ -89,13 +118,52 @@ CellDecimal CellReader::readSlowly(double value)
     const double quotient = factor_ == 1 ? value : value / factor_;
     if (!std::isfinite(quotient))
     { // a number that was internal all along, as a computed one, may be too large for the unit
-        return shortest(value);
+        return counted(shortest(value));
     }
+    const CellDecimal number = readNumber(value, quotient);
+    if (CellDecimal seconds; perUnit_ != 1 && std::llabs(number.digits) >= digitsOfParts && readSeconds(value, seconds))
+    {
+        return seconds;
+    }
+    return counted(number);
+}
+
+/// Finds the degrees, minutes and seconds that a value was read from, as their parts are added when they are read.
+/// @return whether there are such, with up to four decimals of the seconds
+bool CellReader::readSeconds(double value, CellDecimal &seconds) const
+{
+    constexpr double mostSeconds = 1e12;
+    constexpr int mostDecimalsOfSeconds = 4;
+    const double degrees = std::fabs(value) / factor_;
+    qint64 power = 1; // of ten
+    for (int decimals = 0; decimals <= mostDecimalsOfSeconds; ++decimals, power *= 10) {
+        const double scaled = degrees * secondsOfDegree * static_cast<double>(power);
+        if (!(scaled < mostSeconds)) {
+            return false;
+        }
+        const qint64 count = std::llround(scaled);
+        const qint64 half = 180 * secondsOfDegree * power;
+        const auto is = [&](double read) { return read * factor_ == std::fabs(value); };
+        // As an angle, or as a bearing of a quadrant.
+        if (is(degreesOf(count, power)) || is(degreesInMinutes(count, power)) ||
+            is(180 + degreesOf(count - half, power)) || is(180 - degreesOf(half - count, power)) ||
+            is(360 - degreesOf(2 * half - count, power)))
+        {
+            seconds = {value < 0 ? -count : count, -decimals};
+            return true;
+        }
+    }
+    return false;
+}
+
+/// The number of the data, in its own unit.
+CellDecimal CellReader::readNumber(double value, double quotient)
+{
     const CellDecimal number = factor_ == 1 ? shortest(value) : safeDigits(quotient);
     if (number.toDouble() * factor_ == value) {
         const int decimals = -number.exponent;
         const bool isSafe = static_cast<double>(std::llabs(number.digits)) < mostQuick;
-        if (isSafe && decimals > decimals_ && decimals <= digitsOfDouble) {
+        if (isSafe && decimals > decimals_ && decimals <= mostDecimals()) {
             decimals_ = decimals;
             power_ = powersOfTen[static_cast<std::size_t>(decimals)];
         }

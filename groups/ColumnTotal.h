@@ -41,6 +41,15 @@ struct LeftOut
     quint64 firstMissing = 0; ///< row of the table, from 1
     quint64 notFinite = 0;
     quint64 firstNotFinite = 0;
+
+    /// Counts a value. @param row  of the table, from 1
+    void add(bool isMissing, quint64 row)
+    {
+        quint64 &count = isMissing ? missing : notFinite;
+        quint64 &first = isMissing ? firstMissing : firstNotFinite;
+        first = count == 0 ? row : first;
+        ++count;
+    }
 };
 
 } // namespace kareport

@@ -51,7 +51,7 @@ public:
     void clear();
 
     ExactDecimal exact() const;
-    /// The nearest double.
+    /// The nearest double; infinite for a sum beyond all of them.
     double toDouble() const;
 
 private:

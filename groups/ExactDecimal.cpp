@@ -2,7 +2,9 @@
 
 #include <algorithm>
 #include <charconv>
+#include <limits>
 #include <string_view>
+#include <system_error>
 
 namespace kareport
 {
@@ -75,7 +77,11 @@ double ExactDecimal::toDouble() const
 {
     const std::string text = withPoint(digits_.digits(), decimals_);
     double number = 0;
-    std::from_chars(text.data(), text.data() + text.size(), number);
+    const auto end = text.data() + text.size();
+    if (std::from_chars(text.data(), end, number).ec == std::errc::result_out_of_range) {
+        const bool isLarge = text.find_first_of("123456789") < text.find('.');
+        number = isLarge ? std::numeric_limits<double>::infinity() : 0;
+    }
     return isNegative_ ? -number : number;
 }
 

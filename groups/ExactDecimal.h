@@ -41,7 +41,7 @@ public:
     bool isZero() const { return digits_.isZero(); }
     /// The number times a ratio, divided by a divisor (from 1 to `Natural::mostDivisor`), rounded once; halves to even.
     RoundedDecimal rounded(const UnitRatio &ratio, quint64 divisor, int decimals) const;
-    /// The nearest double.
+    /// The nearest double; infinite for a number beyond all of them.
     double toDouble() const;
 
 private:

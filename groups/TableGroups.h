@@ -1,5 +1,6 @@
 #pragma once
 
+#include "CellDecimal.h"
 #include "ExactDecimal.h"
 #include "sXmlReportField.h"
 
@@ -25,9 +26,10 @@ enum class TotalKind
 struct TotalledVariable
 {
     sXmlReportField field; ///< of the table where it has one, else one of the dictionary's variable
-    double factor = 1;     ///< what numbers of the data were multiplied by to become internal
-    UnitRatio ratio;       ///< from the data's unit to the one that is shown
-    bool isAdded = false;  ///< not only counted
+    QString suffix;        ///< that a marker before its column gives an offset
+    CellReader reader;     ///< of its values
+    UnitRatio ratio;       ///< from what the reader counts to the unit that is shown
+    bool isNumber = false; ///< a value that is missing is noted
 };
 
 /// A total of one of the variables.
@@ -52,6 +54,7 @@ struct GroupText
         Kind kind = Kind::Text;
         QString text;
         sXmlReportField field; ///< of the value
+        QString suffix;        ///< that a marker before its column gives an offset
         TotalCell total;
     };
     std::vector<Piece> pieces;

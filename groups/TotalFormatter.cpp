@@ -150,15 +150,17 @@ QString TotalFormatter::longText(const RoundedDecimal &number, QStringView suffi
     }
     const auto format = options_.settings->stationFormat;
     if (field_.Type == VARIABLE_STATION && format != UJobSettings::StationFormat::Plain) {
+        const qsizetype behindPlus = format == UJobSettings::StationFormat::HundredsPlus ? 2 : 3;
         const qsizetype point = text.indexOf(u'.');
         const qsizetype whole = point < 0 ? text.size() : point;
-        text.insert(whole - (format == UJobSettings::StationFormat::HundredsPlus ? 2 : 3), u'+');
+        text.insert(0, QString(std::max<qsizetype>(behindPlus + 1 - whole, 0), u'0'));
+        text.insert(std::max(whole - behindPlus, qsizetype(1)), u'+');
     }
     return sign + text;
 }
 
 TotalledCell::TotalledCell(const TotalledVariable &variable, const FormatOptions &options, bool addsPrinted)
-    : reader_(variable.factor),
+    : reader_(variable.reader),
       options_(options),
       type_(variable.field.Type),
       addsPrinted_(addsPrinted),
@@ -214,7 +216,7 @@ std::optional<double> TotalledCell::internal(const ColumnTotal &total, TotalKind
     }
     const double sum = total.sum.toDouble();
     const double number = kind == TotalKind::Mean ? sum / static_cast<double>(total.count) : sum;
-    return addsPrinted_ ? number / shown(1) : number * reader_.factor();
+    return addsPrinted_ ? number / shown(1) : reader_.internal(number);
 }
 
 void TotalledCell::add(ColumnTotal &total, const Value &value) const

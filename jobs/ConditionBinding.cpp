@@ -4,6 +4,8 @@
 #include "Measures.h"
 #include "Xlate.h"
 
+#include <cmath>
+
 namespace kareport
 {
 
@@ -24,16 +26,23 @@ void bindLimit(RowCondition &bound, const TableShape::Condition &condition, cons
     bound.limit = numberOf(&*limit).value_or(0);
     if (bound.kind == RowCondition::Kind::Outside && !(bound.limit >= 0)) {
         lookup.fail(condition.values.front().path, Xlate("a tolerance from 0 on was expected"));
+    } else if (std::isnan(bound.limit)) {
+        lookup.fail(condition.values.front().path, Xlate("a number was expected: nothing is above or below NAN"));
     }
     if (!condition.beside) {
         return;
     }
+    if (std::isfinite(bound.limit)) { // as differences become internal
+        bound.limit = bound.reader.internal(bound.reader.read(bound.limit).toDouble());
+    }
     const FoundVariable beside = lookup.find(*condition.beside);
+    lookup.expectSet(*condition.beside, beside);
     if (!lookup.error() && measureOf(beside.type) != measureOf(of.type)) {
         lookup.fail(condition.beside->path,
                     Xlate("\"%1\" and \"%2\" cannot be compared: they have different units").arg(of.name, beside.name));
     }
     bound.beside = beside.id;
+    bound.turn = beside.turn ? of.turn : std::nullopt;
 }
 
 } // namespace
@@ -43,6 +52,7 @@ RowCondition bindCondition(const TableShape::Condition &condition, VariableLooku
     using Kind = RowCondition::Kind;
     RowCondition bound;
     const FoundVariable of = lookup.find(condition.of);
+    lookup.expectSet(condition.of, of);
     if (lookup.error()) {
         return bound;
     }

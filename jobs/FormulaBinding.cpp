@@ -65,6 +65,7 @@ std::optional<RowFormula> bindFormula(const TableShape::Formula &formula, const 
         } else if (!lookup.error() && !isNumeric(operands.back().type)) {
             lookup.fail(name.path, Xlate("values of the variable \"%1\" are no numbers").arg(name.text));
         }
+        lookup.expectSet(name, operands.back());
     }
     if (lookup.error()) {
         return std::nullopt;
@@ -89,9 +90,16 @@ std::optional<RowFormula> bindFormula(const TableShape::Formula &formula, const 
     for (const FoundVariable &operand : operands) {
         bound.operands.push_back({operand.id, operand.reader});
         bound.productFactor *= operand.reader.factor();
+        bound.productPerUnit *= operand.reader.perUnit();
     }
     bound.target = result.id;
     bound.result = result.reader;
+    bound.direction = result.turn;
+    const bool areDirections = std::all_of(operands.begin(), operands.end(),
+                                           [](const FoundVariable &operand) { return operand.turn.has_value(); });
+    if (areDirections) {
+        bound.turn = operands.front().turn;
+    }
     return bound;
 }
 

@@ -118,12 +118,15 @@ TotalCell GroupBinding::total(const QString &kind, const TableShape::Name &name)
     if (found == groups_.variables.end()) {
         TotalledVariable added;
         added.field = lookup_.fieldOf(variable);
-        added.factor = variable.reader.factor();
+        added.suffix = lookup_.suffixOf(variable);
+        added.reader = variable.reader;
+        added.isNumber = isNumeric(variable.type);
         added.ratio = unitRatio(variable.type, lookup_.surroundings().units, lookup_.surroundings().settings);
+        if (variable.reader.perUnit() != 1) {
+            added.ratio.divisors.push_back(static_cast<quint32>(variable.reader.perUnit()));
+        }
         groups_.variables.push_back(std::move(added));
     }
-    TotalledVariable &totalled = groups_.variables[cell.variable];
-    totalled.isAdded = totalled.isAdded || cell.kind != TotalKind::Count;
     return cell;
 }
 

@@ -61,6 +61,7 @@ std::optional<Piece> placeholderOf(const QString &name, const JsonPath &path, co
         piece.kind = Piece::Kind::Value;
         piece.field = lookup.fieldOf(*variable);
         piece.field.Width = 0;
+        piece.suffix = lookup.suffixOf(*variable);
         return piece;
     }
     if (name == u"count") {

@@ -122,7 +122,8 @@ private:
         SizeLimit count(nullptr, *output_.mostBytes);
         QString problem;
         const bool isExceeded = !writeTo(count, problem) && count.isExceeded();
-        warnings_.clear(); // they come again
+        // Those of the writing come again.
+        warnings_ = results_ != nullptr ? results_->warnings() : QStringList();
         notes_.clear();
         return isExceeded;
     }

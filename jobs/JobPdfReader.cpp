@@ -1,23 +1,10 @@
 #include "JobPdfReader.h"
 
+#include "LanguageTag.h"
 #include "Xlate.h"
-
-#include <QRegularExpression>
 
 namespace kareport
 {
-
-namespace
-{
-
-/// Whether a text has the form of a language tag: parts of letters and digits with hyphens between, the first of letters alone.
-bool isLanguage(const QString &text)
-{
-    static const QRegularExpression tag(QStringLiteral("^[A-Za-z]{1,8}(-[A-Za-z0-9]{1,8})*\\z"));
-    return tag.match(text).hasMatch();
-}
-
-} // namespace
 
 std::shared_ptr<const Job::Pdf> readPdf(const JsonNode &node)
 {
@@ -35,7 +22,7 @@ std::shared_ptr<const Job::Pdf> readPdf(const JsonNode &node)
     }
     if (const JsonNode language = node["language"]; language.exists()) {
         pdf->language = language.text();
-        if (!isLanguage(pdf->language)) {
+        if (!isLanguageTag(pdf->language)) {
             language.fail(Xlate("a language such as de or en-GB was expected"));
         }
     }

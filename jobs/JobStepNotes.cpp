@@ -6,88 +6,10 @@
 #include "UXmlReportTpl.h"
 #include "Xlate.h"
 
-#include <algorithm>
-
 // What the steps of a job note on the data and the template.
 
 namespace kareport
 {
-
-namespace
-{
-
-/// The first of two errors.
-std::optional<InputError> firstOf(std::optional<InputError> first, std::optional<InputError> second)
-{
-    return first ? first : second;
-}
-
-/// What is said of a value, and of several.
-struct ValueSentences
-{
-    QString one;
-    QString several;
-};
-
-ValueSentences wideSentences()
-{
-    return {Xlate("%1 value is wider than the field \"%2\" of the %3 \"%4\", in row %5, line %6 of the report"),
-            Xlate("%1 values are wider than the field \"%2\" of the %3 \"%4\", the first one in row %5, line %6 of the "
-                  "report")};
-}
-
-ValueSentences hashSentences()
-{
-    return {Xlate("%1 value is wider than the field \"%2\" of the %3 \"%4\" and shows as #, in row %5, line %6 of the "
-                  "report"),
-            Xlate("%1 values are wider than the field \"%2\" of the %3 \"%4\" and show as #, the first one in row %5, "
-                  "line %6 of the report")};
-}
-
-ValueSentences infiniteSentences()
-{
-    return {
-        Xlate("%1 value of the field \"%2\" of the %3 \"%4\" is infinite or not a number, in row %5, line %6 of the "
-              "report"),
-        Xlate("%1 values of the field \"%2\" of the %3 \"%4\" are infinite or not a number, the first one in row %5, "
-              "line %6 of the report")};
-}
-
-ValueSentences zeroSentences()
-{
-    return {Xlate("%1 value of the field \"%2\" of the %3 \"%4\" is missing and shows as 0, in row %5, line %6 of the "
-                  "report"),
-            Xlate("%1 values of the field \"%2\" of the %3 \"%4\" are missing and show as 0, the first one in row %5, "
-                  "line %6 of the report")};
-}
-
-ValueSentences blankSentences()
-{
-    return {
-        Xlate("%1 value of the field \"%2\" of the %3 \"%4\" is missing and shows as blanks, in row %5, line %6 of the "
-              "report"),
-        Xlate("%1 values of the field \"%2\" of the %3 \"%4\" are missing and show as blanks, the first one in row "
-              "%5, line %6 of the report")};
-}
-
-ValueSentences missingInTotals()
-{
-    return {
-        Xlate("%1 value of the variable \"%2\" is missing and in no total of the table \"%3\", in row %4"),
-        Xlate(
-            "%1 values of the variable \"%2\" are missing and in no total of the table \"%3\", the first one in row %4")};
-}
-
-ValueSentences infiniteInTotals()
-{
-    return {
-        Xlate("%1 value of the variable \"%2\" is infinite or not a number and in no total of the table \"%3\", in row "
-              "%4"),
-        Xlate("%1 values of the variable \"%2\" are infinite or not a number and in no total of the table \"%3\", the "
-              "first one in row %4")};
-}
-
-} // namespace
 
 /// Something about a variable that a table or block names, with its place in the template; the step has one anyway.
 InputError JobSteps::inTemplate(TemplatePart part, const QString &variable, const WrittenRecord &record,
@@ -179,76 +101,6 @@ JobSteps::Wrong JobSteps::noteSortKeys(const WrittenRecord &record)
         const QString text = joinedQuestion(sentence, question);
         wrong = firstOf(wrong, notes_.add({{JobNote::Kind::UnknownSortKey,
                                             inTemplate(TemplatePart::SortKey, key.VariableName, record, text)}}));
-    }
-    return wrong;
-}
-
-/// Notes which values of a table or block that was written do not show as they are.
-JobSteps::Wrong JobSteps::noteValues(RowList &rows, const std::optional<SourceColumns> &columns,
-                                     const WrittenRecord &record)
-{
-    const QStringList variables = columns ? columns->variables : QStringList();
-    const QSet<QString> read(variables.begin(), variables.end());
-    Wrong wrong;
-    for (const ColumnRemarks &column : notes_.remarks.columns) {
-        const bool isRead = !columns || read.contains(foldedKey(column.variable));
-        wrong = firstOf(wrong, noteValue(column, isRead, rows, record));
-    }
-    return wrong;
-}
-
-JobSteps::Wrong JobSteps::noteValue(const ColumnRemarks &column, bool isRead, RowList &rows,
-                                    const WrittenRecord &record)
-{
-    using Kind = JobNote::Kind;
-    Wrong wrong;
-    const auto note = [&](Kind kind, const ValueCount &values, const ValueSentences &sentences) {
-        if (values.count == 0) {
-            return;
-        }
-        const QString text = (values.count == 1 ? sentences.one : sentences.several)
-                                 .arg(QString::number(values.count), column.variable, record.what, record.name,
-                                      QString::number(values.firstRow), QString::number(values.firstLine));
-        JobNote found = {kind, source_.errorAt(record.path, text), values.firstLine, values.count, values.firstRow};
-        const auto place = rows.placeOf(static_cast<std::size_t>(values.firstRow) - 1, column.variable);
-        found.dataFile = place.file;
-        found.dataPlace = place.place;
-        wrong = firstOf(wrong, notes_.add({found}));
-    };
-    note(Kind::WideValue, column.tooWide, job_.options.printHash ? hashSentences() : wideSentences());
-    note(Kind::NotFinite, column.notFinite, infiniteSentences());
-    // Of a field that no column fills there is a note already.
-    if (isRead) {
-        note(Kind::MissingValue, column.missing, zeroSentences());
-        note(Kind::BlankValue, column.blank, blankSentences());
-    }
-    return wrong;
-}
-
-/// Notes which values are in no total of a table that was written.
-JobSteps::Wrong JobSteps::noteLeftOut(ShownRows &rows, const WrittenRecord &record)
-{
-    Wrong wrong;
-    const auto note = [&](const QString &variable, quint64 count, quint64 firstRow, const ValueSentences &sentences) {
-        if (count == 0) {
-            return;
-        }
-        const QString text = (count == 1 ? sentences.one : sentences.several)
-                                 .arg(QString::number(count), variable, record.name, QString::number(firstRow));
-        JobNote found = {JobNote::Kind::NotInTotal, source_.errorAt(record.path, text), 0, count, firstRow};
-        const auto place = rows.placeOf(static_cast<std::size_t>(firstRow) - 1, variable);
-        found.dataFile = place.file;
-        found.dataPlace = place.place;
-        wrong = firstOf(wrong, notes_.add({found}));
-    };
-    const auto &variables = rows.groups().variables;
-    for (std::size_t i = 0; i < rows.leftOut().size(); ++i) {
-        const LeftOut &out = rows.leftOut()[i];
-        if (variables[i].isAdded) {
-            const QString &name = variables[i].field.VariableName;
-            note(name, out.missing, out.firstMissing, missingInTotals());
-            note(name, out.notFinite, out.firstNotFinite, infiniteInTotals());
-        }
     }
     return wrong;
 }

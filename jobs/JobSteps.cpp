@@ -3,29 +3,22 @@
 #include "NearestName.h"
 #include "PageMark.h"
 #include "ReportOutline.h"
-#include "ShapeBinding.h"
 #include "TemplateCheck.h"
 #include "UXmlReportTpl.h"
 #include "Xlate.h"
 
-#include <algorithm>
 #include <new>
 
 namespace kareport
 {
 
-namespace
-{
-
 /// What has been found writable is not written for one reason only.
-void needMemory(bool isWritten)
+void JobSteps::expectMemory(bool isWritten)
 {
     if (!isWritten) {
         throw std::bad_alloc();
     }
 }
-
-} // namespace
 
 std::optional<InputError> JobSteps::write()
 {
@@ -37,7 +30,7 @@ std::optional<InputError> JobSteps::write()
         if (wrong || isStopped_()) {
             return wrong;
         }
-        needMemory(!report_.HasLostText());
+        expectMemory(!report_.HasLostText());
     }
     return std::nullopt;
 }
@@ -85,7 +78,8 @@ JobSteps::Wrong JobSteps::write(const Job::Block &step, const JsonPath &path)
         report_.GetTemplate()->GetAllBlocks(names);
         return noSuchRecord(Xlate("block"), step.name, names, path);
     }
-    if (auto wrong = wrongRecord(*block, Xlate("block"), step.name, path)) {
+    const WrittenRecord record = {Xlate("block"), TemplatePart::Block, step.name, block->Use, block->Fields, path};
+    if (auto wrong = wrongRecord(record)) {
         return wrong;
     }
     const auto opened = openRows(step.data, block->Use, true, &block->Fields);
@@ -105,7 +99,6 @@ JobSteps::Wrong JobSteps::write(const Job::Block &step, const JsonPath &path)
     if (auto error = rows.error()) {
         return error;
     }
-    const WrittenRecord record = {Xlate("block"), TemplatePart::Block, step.name, block->Use, block->Fields, path};
     const auto columns = rows.columns();
     if (auto wrong = columns ? noteColumns(*columns, step.data, record) : std::nullopt) {
         return wrong;
@@ -116,90 +109,10 @@ JobSteps::Wrong JobSteps::write(const Job::Block &step, const JsonPath &path)
     if (!hasRow) {
         return isStopped_() ? std::nullopt : std::optional(data_.noRow(step.data, path));
     }
-    describeResults(step.data, block->Use, nullptr);
-    needMemory(report_.WriteDataBlock(step.name, &first, step.before, step.after));
+    describeResults(step.data, block->Use, QStringList());
+    expectMemory(report_.WriteDataBlock(step.name, &first, step.before, step.after));
     addFit(false, step.name, block->Fields, step.data, path);
     return noteValues(rows, columns, record);
-}
-
-JobSteps::Wrong JobSteps::write(const Job::Table &step, const JsonPath &path)
-{
-    const sXmlReportTable *table = report_.GetTemplate()->GetTable(step.name);
-    if (table == nullptr) {
-        QStringList names;
-        report_.GetTemplate()->GetAllTables(names);
-        return noSuchRecord(Xlate("table"), step.name, names, path);
-    }
-    if (auto wrong = wrongRecord(*table, Xlate("table"), step.name, path)) {
-        return wrong;
-    }
-    auto opened = openRows(step.data, table->Use, false, step.shape.isEmpty() ? &table->Fields : nullptr);
-    if (const InputError *error = errorOf(opened)) {
-        return *error;
-    }
-    auto &list = std::get<std::unique_ptr<RowList>>(opened);
-    const auto shaped = shape(list, step, *table);
-    if (const InputError *error = errorOf(shaped)) {
-        return *error;
-    }
-    RowList &rows = *list;
-    const WrittenRecord record = {Xlate("table"), TemplatePart::Table, step.name, table->Use, table->Fields, path};
-    // Columns that are known already are looked at before hundreds of thousands of rows are.
-    auto columns = rows.columns();
-    if (auto wrong = columns ? noteColumns(*columns, step.data, record) : std::nullopt) {
-        return wrong;
-    }
-    if (auto wrong = noteSortKeys(record)) {
-        return wrong;
-    }
-    report_.AnnounceEntry(ReportOutline::tableLevel, table->Name);
-    describeResults(step.data, table->Use, report_.GetTemplate()->GetSortList(step.name));
-    needMemory(report_.WriteDataTable(step.name, &rows, step.before, step.after, step.headingAfter));
-    if (const auto error = rows.error()) {
-        return error;
-    }
-    addFit(true, step.name, table->Fields, step.data, path);
-    if (!columns) {
-        columns = rows.columns();
-        if (auto wrong = columns ? noteColumns(*columns, step.data, record) : std::nullopt) {
-            return wrong;
-        }
-    }
-    if (isStopped_()) {
-        return std::nullopt;
-    }
-    auto wrong = noteSource(rows);
-    auto other = noteValues(rows, columns, record);
-    wrong = wrong ? wrong : other;
-    if (ShownRows *const shown = std::get<ShownRows *>(shaped)) {
-        other = noteLeftOut(*shown, record);
-    }
-    return wrong ? wrong : other;
-}
-
-/// Has rows shown as a step asks for it. @return null where it asks for nothing
-Expected<ShownRows *> JobSteps::shape(std::unique_ptr<RowList> &rows, const Job::Table &step,
-                                      const sXmlReportTable &table)
-{
-    if (step.shape.isEmpty()) {
-        return static_cast<ShownRows *>(nullptr);
-    }
-    const ShapeSurroundings surroundings = {source_, *report_.GetTemplate(), table, units_, job_.settings};
-    auto bound = bindShape(step.shape, surroundings);
-    if (const InputError *error = errorOf(bound)) {
-        return *error;
-    }
-    auto &[shape, sortIds] = std::get<BoundShape>(bound);
-    auto shown = std::make_unique<ShownRows>(std::move(rows), std::move(shape));
-    ShownRows *const list = shown.get();
-    rows = std::move(shown);
-    if (!sortIds.empty()) {
-        list->Sort(sortIds);
-        if (const auto error = list->error()) {
-            return *error;
-        }
-    }
-    return list;
 }
 
 JobSteps::Wrong JobSteps::noSuchRecord(const QString &what, const QString &name, const QStringList &names,
@@ -227,16 +140,6 @@ void JobSteps::addResultText(ResultText kind, QString text, int style)
     }
 }
 
-void JobSteps::describeResults(const QString &data, const QString &dictionary, const sXmlSortTableReport *sort)
-{
-    if (results_ != nullptr) {
-        const Job::DataSet &set = *job_.data.constFind(data);
-        // What says its units itself is read in metres, square metres and degrees.
-        results_->describe({set.source->hasOwnUnits() ? DataUnits() : set.units,
-                            report_.GetTemplate()->GetDictionary(dictionary), sort});
-    }
-}
-
 void JobSteps::addFit(bool isTable, const QString &name, const sXmlReportFields &fields, const QString &data,
                       const JsonPath &path)
 {
@@ -247,20 +150,19 @@ void JobSteps::addFit(bool isTable, const QString &name, const sXmlReportFields 
 }
 
 /// What keeps a table or block that the template has from being written.
-template <typename Record>
-JobSteps::Wrong JobSteps::wrongRecord(const Record &record, const QString &what, const QString &name,
-                                      const JsonPath &path) const
+JobSteps::Wrong JobSteps::wrongRecord(const WrittenRecord &record) const
 {
-    if (report_.GetTemplate()->GetDictionary(record.Use) == nullptr) {
-        return source_.errorAt(path,
+    if (report_.GetTemplate()->GetDictionary(record.use) == nullptr) {
+        return source_.errorAt(record.path,
                                Xlate("the %1 \"%2\" cannot be written: the template has no dictionary named \"%3\"")
-                                   .arg(what, name, record.Use));
+                                   .arg(record.what, record.name, record.use));
     }
-    for (const sXmlReportField &field : record.Fields) {
+    for (const sXmlReportField &field : record.fields) {
         if (field.Width > widestColumn || field.Width < -widestColumn || field.Decimals > widestColumn) {
             return source_.errorAt(
-                path, Xlate("the %1 \"%2\" cannot be written: the format of its field \"%3\" is beyond %4 characters")
-                          .arg(what, name, field.VariableName, QString::number(widestColumn)));
+                record.path,
+                Xlate("the %1 \"%2\" cannot be written: the format of its field \"%3\" is beyond %4 characters")
+                    .arg(record.what, record.name, field.VariableName, QString::number(widestColumn)));
         }
     }
     return std::nullopt;

@@ -73,8 +73,10 @@ private:
     Wrong write(const Job::Table &step, const JsonPath &path);
 
     Wrong noSuchRecord(const QString &what, const QString &name, const QStringList &names, const JsonPath &path) const;
-    template <typename Record>
-    Wrong wrongRecord(const Record &record, const QString &what, const QString &name, const JsonPath &path) const;
+    /// The first of two errors.
+    static Wrong firstOf(Wrong first, Wrong second) { return first ? std::move(first) : std::move(second); }
+    Wrong wrongRecord(const WrittenRecord &record) const;
+    static void expectMemory(bool isWritten);
     /// @param shown  the fields that show what is read; null where more is made of it
     Expected<std::unique_ptr<RowList>> openRows(const QString &data, const QString &dictionary, bool firstOnly,
                                                 const sXmlReportFields *shown);
@@ -84,10 +86,17 @@ private:
     Wrong noteSortKeys(const WrittenRecord &record);
     Wrong noteSource(const RowList &rows);
     Wrong noteLeftOut(ShownRows &rows, const WrittenRecord &record);
-    Expected<ShownRows *> shape(std::unique_ptr<RowList> &rows, const Job::Table &step, const sXmlReportTable &table);
+    /// What a table step makes of its rows.
+    struct ShapedRows
+    {
+        ShownRows *rows = nullptr; ///< null where it asks for nothing
+        QStringList needed;        ///< the variables of the data that it names
+    };
+    Expected<ShapedRows> shape(std::unique_ptr<RowList> &rows, const Job::Table &step, const sXmlReportTable &table);
+    QStringList neededVariables(const QString &table, const QStringList &named) const;
     QString shownText(const QString &text) const;
     void addResultText(ResultText kind, QString text, int style);
-    void describeResults(const QString &data, const QString &dictionary, const sXmlSortTableReport *sort);
+    void describeResults(const QString &data, const QString &dictionary, const QStringList &needed);
     void addFit(bool isTable, const QString &name, const sXmlReportFields &fields, const QString &data,
                 const JsonPath &path);
     Wrong noteValues(RowList &rows, const std::optional<SourceColumns> &columns, const WrittenRecord &record);

@@ -1,10 +1,9 @@
 #include "ResultOptionsReader.h"
 
 #include "JobFileName.h"
+#include "LanguageTag.h"
 #include "NearestName.h"
 #include "Xlate.h"
-
-#include <algorithm>
 
 namespace kareport
 {
@@ -47,26 +46,24 @@ ResultValues readValues(const JsonNode &node, OutputKind kind)
     return name == second.name ? second.values : first.values;
 }
 
-bool readIsOneSheet(const JsonNode &node)
+/// Whether the second one of two words is said; the first one may be said as well.
+bool readIsSecond(const JsonNode &node, const QString &first, const QString &second)
 {
     const QString name = node.text();
-    if (node.exists() && name != u"tables" && name != u"one") {
-        node.fail(oneOfExpected(name, QStringLiteral("tables, one").split(QStringLiteral(", "))));
+    if (node.exists() && name != first && name != second) {
+        QStringList names;
+        names.append(first);
+        names.append(second);
+        node.fail(oneOfExpected(name, names));
     }
-    return name == u"one";
+    return name == second;
 }
 
 /// A tag of a language such as "de" or "pt-BR".
 QString readLanguage(const JsonNode &node)
 {
     const QString tag = node.text();
-    const auto isPart = [](QStringView part) {
-        return part.size() >= 2 && part.size() <= 8 && std::all_of(part.begin(), part.end(), [](QChar character) {
-                   return character < u'\x80' && character.isLetterOrNumber();
-               });
-    };
-    const auto parts = QStringView(tag).split(u'-');
-    if (node.exists() && !std::all_of(parts.begin(), parts.end(), isPart)) {
+    if (node.exists() && !isLanguageTag(tag)) {
         node.fail(Xlate("the tag of a language such as de or pt-BR was expected"));
     }
     return tag;
@@ -100,7 +97,7 @@ QStringList outputKeys(OutputKind kind)
     switch (kind) {
     case OutputKind::Csv: keys += QStringLiteral(" delimiter"); break;
     case OutputKind::Html: keys += QStringLiteral(" title language rowsPerPage"); break;
-    case OutputKind::Xlsx: keys += QStringLiteral(" values sheets bearingValues"); break;
+    case OutputKind::Xlsx: keys += QStringLiteral(" values sheets bearingValues totals"); break;
     default: break;
     }
     return keys.split(u' ');
@@ -127,7 +124,9 @@ ResultOptions readResultOptions(const JsonNode &node, OutputKind kind, const QDi
     options.data = readName(node[QStringLiteral("data")]);
     options.values = readValues(node[QStringLiteral("values")], kind);
     options.delimiter = readDelimiter(node[QStringLiteral("delimiter")]);
-    options.isOneSheet = readIsOneSheet(node[QStringLiteral("sheets")]);
+    options.isOneSheet = readIsSecond(node[QStringLiteral("sheets")], QStringLiteral("tables"), QStringLiteral("one"));
+    options.formulas =
+        readIsSecond(node[QStringLiteral("totals")], QStringLiteral("values"), QStringLiteral("formulas"));
     options.bearingValues = node[QStringLiteral("bearingValues")].boolean(false);
     options.title = readName(node[QStringLiteral("title")]);
     options.language = readLanguage(node[QStringLiteral("language")]);

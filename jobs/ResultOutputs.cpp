@@ -3,6 +3,7 @@
 #include "CsvResult.h"
 #include "HtmlResult.h"
 #include "JsonLinesResult.h"
+#include "ResultColumns.h"
 #include "ResultSchema.h"
 #include "TextFolding.h"
 #include "UDataObject.h"
@@ -85,15 +86,6 @@ std::unique_ptr<ResultFile> makeFile(const Output &output, const Job::Step *step
     case OutputKind::Schema: return std::make_unique<ResultSchema>(options);
     default: return nullptr;
     }
-}
-
-/// The key of the unit that numbers of a value type are in; empty for a type without a unit.
-QString unitOf(int type, DataUnits units)
-{
-    units.isLengthSaid = false;
-    units.isAreaSaid = false;
-    units.isAngleSaid = false;
-    return units.assumedKey(type);
 }
 
 } // namespace
@@ -179,45 +171,20 @@ bool ResultOutputs::isWanted(const File &file) const
     return step_ >= firstStep_ && (!file.step || *file.step == step_);
 }
 
-void ResultOutputs::describeColumn(ResultColumn &column) const
+/// Makes columns of the variables that the table does not show and that make its rows what they are.
+void ResultOutputs::addHiddenColumns(ResultTable &table)
 {
-    const QString &name = column.field.VariableName;
-    const auto &variables = data_.dictionary->Variables;
-    column.isVariable = std::any_of(variables.begin(), variables.end(), [&name](const sXmlReportVariable &variable) {
-        return equalFolded(variable.VariableName, name);
-    });
-    column.dataFactor = data_.units.factorOf(column.field.Type);
-    column.dataUnit = unitOf(column.field.Type, data_.units);
-}
-
-/// Makes columns of the sort keys that the table does not show.
-void ResultOutputs::addSortKeys(ResultTable &table)
-{
-    sortKeys_.clear();
-    for (const sXmlSortVariable &key : data_.sort != nullptr ? data_.sort->Entries : std::vector<sXmlSortVariable>()) {
-        const bool isColumn =
-            std::any_of(table.columns.begin(), table.columns.end(), [&key](const ResultColumn &column) {
-                return static_cast<quint32>(column.field.ID) == key.ID && column.isVariable;
-            });
-        const auto &variables = data_.dictionary->Variables;
-        // Of several variables of one name the last one counts.
-        const auto variable =
-            std::find_if(variables.rbegin(), variables.rend(), [&key](const sXmlReportVariable &other) {
-                return equalFolded(other.VariableName, key.VariableName);
-            });
-        if (isColumn || variable == variables.rend()) {
-            continue;
+    hidden_.clear();
+    for (const QString &name : data_.needed) {
+        auto column = hiddenColumn(name, *data_.dictionary);
+        const bool isColumn = column && std::any_of(table.columns.begin(), table.columns.end(), [&](const auto &other) {
+                                  return other.field.ID == column->field.ID && other.isVariable;
+                              });
+        if (column && !isColumn) {
+            hidden_.push_back(static_cast<unsigned>(column->field.ID));
+            describeColumn(*column, *data_.dictionary, data_.units);
+            table.columns.push_back(*std::move(column));
         }
-        ResultColumn column;
-        column.field.VariableName = variable->VariableName;
-        column.field.Label = variable->VariableName;
-        column.field.Align = QStringLiteral("L");
-        column.field.ID = variable->ID;
-        column.field.Type = variable->Type;
-        column.isShown = false;
-        describeColumn(column);
-        sortKeys_.push_back(static_cast<unsigned>(variable->ID));
-        table.columns.push_back(std::move(column));
     }
 }
 
@@ -231,9 +198,9 @@ bool ResultOutputs::beginTable(const ResultTable &table)
         described.name = block->name;
     }
     for (ResultColumn &column : described.columns) {
-        describeColumn(column);
+        describeColumn(column, *data_.dictionary, data_.units);
     }
-    addSortKeys(described);
+    addHiddenColumns(described);
     bool isAnyWanted = false;
     for (File &file : files_) {
         file.wantsRows = isWanted(file) && file.file->beginTable(described);
@@ -245,9 +212,9 @@ bool ResultOutputs::beginTable(const ResultTable &table)
 void ResultOutputs::addRow(const ResultRow &row)
 {
     const ResultRow *whole = &row;
-    if (!sortKeys_.empty()) {
+    if (!hidden_.empty()) {
         row_ = row;
-        for (const unsigned key : sortKeys_) {
+        for (const unsigned key : hidden_) {
             row_.cells.push_back({row.object != nullptr ? row.object->Find(key) : nullptr, QStringView()});
         }
         whole = &row_;

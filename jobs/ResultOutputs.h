@@ -6,7 +6,8 @@
 #include "ResultFile.h"
 #include "ResultSink.h"
 #include "sXmlReportDictionary.h"
-#include "sXmlSortTableReport.h"
+
+#include <QStringList>
 
 #include <memory>
 #include <optional>
@@ -45,7 +46,7 @@ public:
     {
         DataUnits units;
         const sXmlReportDictionary *dictionary = nullptr; ///< of its variables
-        const sXmlSortTableReport *sort = nullptr;        ///< the table's sort keys; null for none
+        QStringList needed; ///< variables without which the rows are not written the same again
     };
     /// Says that a step of the job comes.
     void beginStep(const Job::Step &step);
@@ -67,15 +68,14 @@ private:
     };
 
     bool isWanted(const File &file) const;
-    void describeColumn(ResultColumn &column) const;
-    void addSortKeys(ResultTable &table);
+    void addHiddenColumns(ResultTable &table);
 
     const Job &job_;
     std::vector<File> files_;
     std::size_t firstStep_ = 0; ///< that is not discarded
     std::size_t step_ = 0;
     Data data_;
-    std::vector<unsigned> sortKeys_; ///< the identifiers of those that are columns by themselves
+    std::vector<unsigned> hidden_; ///< the identifiers of columns that the table does not show
     ResultRow row_;
 };
 

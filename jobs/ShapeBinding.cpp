@@ -9,6 +9,7 @@
 #include "VariableType.h"
 #include "Xlate.h"
 
+#include <algorithm>
 #include <utility>
 
 namespace kareport
@@ -26,6 +27,8 @@ public:
     BoundShape bind();
 
 private:
+    void addSets();
+    int firstFlagOf(const QString &variable) const;
     void bindSort();
     void bindFormula(const TableShape::Formula &formula);
     void bindRunning(const TableShape::Running &running);
@@ -40,20 +43,52 @@ private:
 
 BoundShape Binding::bind()
 {
+    addSets();
+    int stage = 0;
     for (const TableShape::Formula &formula : shape_.compute) {
+        lookup_.goTo(stage++);
         bindFormula(formula);
     }
+    lookup_.goTo(stage++);
     for (const TableShape::Condition &one : shape_.where) {
         bound_.rows.conditions.push_back(bindCondition(one, lookup_));
     }
     for (const TableShape::Running &running : shape_.running) {
+        lookup_.goTo(stage++);
         bindRunning(running);
     }
     for (const TableShape::Flag &flag : shape_.flags) {
+        lookup_.goTo(stage + firstFlagOf(flag.variable.text));
         bindFlag(flag);
     }
     bindSort();
+    bound_.needed = lookup_.needed();
     return std::move(bound_);
+}
+
+/// Says which variables the step sets, in the order that it sets them in.
+void Binding::addSets()
+{
+    int stage = 0;
+    for (const TableShape::Formula &formula : shape_.compute) {
+        lookup_.addSet(formula.variable.text, stage++);
+    }
+    ++stage; // of the conditions
+    for (const TableShape::Running &running : shape_.running) {
+        lookup_.addSet(running.variable.text, stage++);
+    }
+    for (const TableShape::Flag &flag : shape_.flags) {
+        lookup_.addSet(flag.variable.text, stage + firstFlagOf(flag.variable.text));
+    }
+}
+
+/// The first of the flags that set a variable: all of them are asked with it.
+int Binding::firstFlagOf(const QString &variable) const
+{
+    const auto found = std::find_if(shape_.flags.begin(), shape_.flags.end(), [&](const TableShape::Flag &flag) {
+        return equalFolded(flag.variable.text, variable);
+    });
+    return static_cast<int>(found - shape_.flags.begin());
 }
 
 /// A variable that rows are given.
@@ -99,7 +134,7 @@ void Binding::bindSort()
     };
     for (const TableShape::Name &name : shape_.sort) {
         bound_.sortIds.push_back(lookup_.find(name).id);
-        if (setName(name.text) != nullptr) {
+        if (lookup_.isSet(bound_.sortIds.back())) {
             failSet(name.path, name.text);
         }
     }
@@ -138,6 +173,7 @@ void Binding::bindRunning(const TableShape::Running &running)
             lookup_.fail(running.of.path,
                          Xlate("another variable with numbers, lengths, areas or angles was expected"));
         }
+        lookup_.expectSet(running.of, of);
     }
     if (lookup_.error()) {
         return;

@@ -8,6 +8,8 @@
 #include "UJobSettings.h"
 #include "UXmlReportTpl.h"
 
+#include <QStringList>
+
 #include <optional>
 #include <vector>
 
@@ -19,6 +21,7 @@ struct BoundShape
 {
     RowShape rows;
     std::vector<unsigned> sortIds; ///< of the step's own sort keys; none where it has no such keys
+    QStringList needed;            ///< the variables of the data that the step names
 };
 
 /// What the names of a table step are looked up in.

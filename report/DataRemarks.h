@@ -5,6 +5,7 @@
 #include <QString>
 #include <QtGlobal>
 
+#include <array>
 #include <utility>
 #include <vector>
 
@@ -27,10 +28,14 @@ struct ColumnRemarks
     ValueCount missing;    ///< values that are not there and show as 0
     ValueCount blank;      ///< numbers that are not there and show as blanks, as asked for
     ValueCount notFinite;  ///< values that are infinite or not-a-number
+    ValueCount wideTotals; ///< totals wider than the column, with the last row above them
     quint64 wideZeros = 0; ///< how many of the missing values show as a 0 that is wider than the column
     WidestText widest;     ///< the widest value, where it is asked for
     quint64 widestRow = 0; ///< of the table, from 1; 0 for none
     qint64 widestLine = 0; ///< of the report, from 1
+
+    /// All counts of it.
+    std::array<ValueCount *, 5> counts() { return {&tooWide, &missing, &blank, &notFinite, &wideTotals}; }
 };
 
 /// What the table or block that was written last does not show as it is, by its fields.
@@ -68,7 +73,7 @@ struct DataRemarks
     void setLineOf(quint64 row, qint64 line)
     {
         for (ColumnRemarks &column : columns) {
-            for (ValueCount *count : {&column.tooWide, &column.missing, &column.blank, &column.notFinite}) {
+            for (ValueCount *count : column.counts()) {
                 count->firstLine = count->firstRow == row && count->firstLine == 0 ? line : count->firstLine;
             }
             column.widestLine = column.widestRow == row && column.widestLine == 0 ? line : column.widestLine;
@@ -86,7 +91,7 @@ private:
     void giveLine(qint64 line)
     {
         for (ColumnRemarks &column : columns) {
-            for (ValueCount *count : {&column.tooWide, &column.missing, &column.blank, &column.notFinite}) {
+            for (ValueCount *count : column.counts()) {
                 count->firstLine = count->count != 0 && count->firstLine == 0 ? line : count->firstLine;
             }
             column.widestLine = column.widestRow != 0 && column.widestLine == 0 ? line : column.widestLine;

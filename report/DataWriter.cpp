@@ -173,7 +173,7 @@ void DataWriter::writeTable(const UXmlReportTable &table, UDataObjectList &list,
     DataRemarks unwanted;
     DataRemarks &remarks = layout.remarks != nullptr ? *layout.remarks : unwanted;
     remarks = remarksFor(table, remarks);
-    feed_.beginTable(table, layout.chainageLabel);
+    feed_.beginTable(table, layout.chainageLabel, isGrouped && groups->groups().addsPrinted);
     if (isGrouped) {
         writeGroups(table, list, *groups, layout.writeName, remarks);
     } else {
@@ -253,10 +253,10 @@ void DataWriter::writeGroups(const UXmlReportTable &table, UDataObjectList &list
         isPlaced = true;
         placeHeading(table, writeName, lines);
     };
-    GroupResults results(feed_, [&](const UDataObject &object) {
+    GroupResults results(feed_, [&](const UDataObject &object, int level) {
         DataRemarks unused = remarksFor(table, DataRemarks());
         formatRow(fields, object, 0, unused);
-        feed_.endRow(object);
+        feed_.endRow(object, level);
     });
     GroupedTable grouped(page_, options_, table, groups, remarks);
     grouped.giveResults(results);

@@ -17,19 +17,19 @@ namespace kareport
 class GroupResults
 {
 public:
+    using FeedRow = std::function<void(const UDataObject &object, int level)>;
     /// @param feedRow  formats a row for the feed once more, and hands it on
-    GroupResults(ResultFeed &feed, std::function<void(const UDataObject &object)> feedRow)
-        : feed_(feed), feedRow_(std::move(feedRow))
-    {}
+    GroupResults(ResultFeed &feed, FeedRow feedRow) : feed_(feed), feedRow_(std::move(feedRow)) {}
 
     bool isWanted() const { return feed_.isOpen(); }
-    void addText(ResultText kind, QString text);
+    // Levels are those of groups, from 0, as the sink is told them.
+    void addText(ResultText kind, QString text, int level);
     /// Adds a heading of a group whose text is not known yet. @return what `setText` is told
-    std::size_t addOpen();
+    std::size_t addOpen(int level);
     void setText(std::size_t open, QString text);
     /// Adds the row that the feed was given last.
-    void addRow(const UDataObject &object);
-    void addTotals(ResultRowKind kind, std::vector<ResultTotal> totals);
+    void addRow(const UDataObject &object, int level);
+    void addTotals(ResultRowKind kind, std::vector<ResultTotal> totals, int level);
 
 private:
     struct Held
@@ -41,6 +41,7 @@ private:
             Totals
         };
         Kind kind = Kind::Text;
+        int level = 0;
         ResultText textKind = ResultText::GroupHeading;
         QString text;
         UDataObject object;
@@ -52,7 +53,7 @@ private:
     void give(const Held &held);
 
     ResultFeed &feed_;
-    std::function<void(const UDataObject &object)> feedRow_;
+    FeedRow feedRow_;
     std::vector<Held> held_;
     std::size_t open_ = 0; ///< texts that are not known
 };

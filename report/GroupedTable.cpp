@@ -81,12 +81,13 @@ void GroupedTable::write(const Rows &rows)
         beginGroups(first, *object);
         addRow(*object, rows.textOf(*object, row), row);
         if (givesResults()) {
-            results_->addRow(*object);
+            results_->addRow(*object, static_cast<int>(first));
         }
     }
     if (tableRows_ != 0) {
         endGroups(0);
-        giveTotals(ResultRowKind::Total, groups_.tableTotals, totals_.front(), tableRows_, nullptr);
+        giveTotals({ResultRowKind::Total, ResultRow::noLevel}, groups_.tableTotals, totals_.front(), tableRows_,
+                   nullptr);
         lines_.finish(linesOf(groups_.tableTotals, totals_.front(), tableRows_, nullptr));
     }
     remarks_.setMissingLines(page_.lineCount());
@@ -95,7 +96,11 @@ void GroupedTable::write(const Rows &rows)
 
 void GroupedTable::beginGroups(std::size_t first, const UDataObject &object)
 {
-    bool isBound = tableRows_ != 0 && isKept(first);
+    const bool beginsPage =
+        std::any_of(groups_.levels.begin() + static_cast<std::ptrdiff_t>(first), groups_.levels.end(),
+                    [](const GroupLevel &level) { return level.hasHeading && level.newPage; });
+    bool isBound = tableRows_ != 0 && isKept(first) && !beginsPage;
+    bool isFirst = true;
     afterHeading_ = false;
     for (std::size_t i = first; i < groups_.levels.size(); ++i) {
         const GroupLevel &level = groups_.levels[i];
@@ -108,20 +113,21 @@ void GroupedTable::beginGroups(std::size_t first, const UDataObject &object)
         }
         KeptLines::Line line;
         line.isBound = isBound;
-        line.beginsPage = level.newPage;
+        line.beginsPage = beginsPage && isFirst; // the headings of the groups around it go with it
         line.before = level.before;
         line.group = static_cast<int>(i);
         if (level.heading.needsRows()) {
             group.heading = lines_.addOpen(line);
-            group.headingResult = givesResults() ? results_->addOpen() : 0;
+            group.headingResult = givesResults() ? results_->addOpen(line.group) : 0;
         } else {
             const QString text = textOf(level.heading, totals_[i + 1], 0, &group.firstRow);
             lines_.add(line, text);
             if (givesResults()) {
-                results_->addText(ResultText::GroupHeading, text);
+                results_->addText(ResultText::GroupHeading, text, line.group);
             }
         }
         isBound = true;
+        isFirst = false;
         afterHeading_ = true;
     }
 }
@@ -138,7 +144,8 @@ void GroupedTable::endGroups(std::size_t first)
         for (const QString &text : linesOf(level.totals, totals, group.rows, &group.firstRow)) {
             lines_.add(line, text);
         }
-        giveTotals(ResultRowKind::GroupFooter, level.totals, totals, group.rows, &group.firstRow);
+        giveTotals({ResultRowKind::GroupFooter, static_cast<int>(i)}, level.totals, totals, group.rows,
+                   &group.firstRow);
         if (group.heading) {
             const QString text = textOf(level.heading, totals, group.rows, &group.firstRow);
             lines_.setText(*group.heading, text);
@@ -194,23 +201,13 @@ void GroupedTable::addValues(const UDataObject &object, quint64 row)
         const TotalledCell::Value value =
             cells_[i].read(object.Find(static_cast<quint32>(groups_.variables[i].field.ID)));
         if (value.state == TotalledCell::State::Missing || value.state == TotalledCell::State::NotFinite) {
-            noteMissing(i, value.state, row);
+            leftOut_[i].add(value.state == TotalledCell::State::Missing, row + 1);
         }
         cells_[i].add(totals_.back()[i], value);
         if (!groups_.pageTotals.empty()) {
             waiting_.push_back(value);
         }
     }
-}
-
-void GroupedTable::noteMissing(std::size_t variable, TotalledCell::State state, quint64 row)
-{
-    LeftOut &out = leftOut_[variable];
-    const bool isMissing = state == TotalledCell::State::Missing;
-    quint64 &count = isMissing ? out.missing : out.notFinite;
-    quint64 &first = isMissing ? out.firstMissing : out.firstNotFinite;
-    first = count == 0 ? row + 1 : first;
-    ++count;
 }
 
 /// Takes note of the place of a row.

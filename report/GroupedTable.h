@@ -60,14 +60,19 @@ private:
     void endGroups(std::size_t first);
     void addRow(const UDataObject &object, QStringView text, quint64 row);
     void addValues(const UDataObject &object, quint64 row);
-    void noteMissing(std::size_t variable, TotalledCell::State state, quint64 row);
     bool isKept(std::size_t levels) const;
     void countPageRow(const KeptLines::Line &line);
     std::vector<QString> pageEnd();
     void clearPage();
     void addTo(Totals &totals, const Totals &other);
     bool givesResults() const { return results_ != nullptr && results_->isWanted(); }
-    void giveTotals(ResultRowKind kind, const std::vector<TotalLine> &lines, const Totals &totals, quint64 rows,
+    /// Whose totals they are.
+    struct TotalsOf
+    {
+        ResultRowKind kind;
+        int level; ///< of the group
+    };
+    void giveTotals(const TotalsOf &of, const std::vector<TotalLine> &lines, const Totals &totals, quint64 rows,
                     const UDataObject *object);
     std::vector<ResultTotal> resultsOf(const TotalLine &line, const Totals &totals) const;
 
@@ -75,7 +80,7 @@ private:
     QString totalText(const TotalCell &cell, const Totals &totals) const;
     std::vector<QString> linesOf(const std::vector<TotalLine> &lines, const Totals &totals, quint64 rows,
                                  const UDataObject *object) const;
-    QString lineOf(const TotalLine &line, const Totals &totals, const QString &label) const;
+    QString lineOf(const TotalLine &line, const Totals &totals, const QString &label, bool &hasLabel) const;
     QString ruleOf(const std::vector<TotalLine> &lines) const;
     template <typename Cell>
     void appendCells(TextBuffer &out, Cell appendCell) const;

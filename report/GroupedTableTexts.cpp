@@ -20,6 +20,18 @@ bool hasCells(const std::vector<TotalLine> &lines)
     return std::any_of(lines.begin(), lines.end(), [](const TotalLine &line) { return !line.cells.empty(); });
 }
 
+ResultTotalKind resultKind(TotalKind kind)
+{
+    switch (kind) {
+    case TotalKind::Sum: return ResultTotalKind::Sum;
+    case TotalKind::Mean: return ResultTotalKind::Mean;
+    case TotalKind::Least: return ResultTotalKind::Least;
+    case TotalKind::Greatest: return ResultTotalKind::Greatest;
+    case TotalKind::Count: return ResultTotalKind::Count;
+    }
+    return ResultTotalKind::None;
+}
+
 } // namespace
 
 /// A text with the values of a group. @param object  a row of the group; null where the text has no values
@@ -35,7 +47,7 @@ QString GroupedTable::textOf(const GroupText &text, const Totals &totals, quint6
             const UDictEntry *entry = object != nullptr ? object->Find(static_cast<quint32>(piece.field.ID)) : nullptr;
             TextBuffer out;
             if (entry != nullptr) {
-                FieldFormatter(piece.field).append(out, textOptions_, entry->kind(), entry->GetData(), QStringView());
+                FieldFormatter(piece.field).append(out, textOptions_, entry->kind(), entry->GetData(), piece.suffix);
             }
             done += out.view().trimmed();
             break;
@@ -48,7 +60,7 @@ QString GroupedTable::textOf(const GroupText &text, const Totals &totals, quint6
 QString GroupedTable::totalText(const TotalCell &cell, const Totals &totals) const
 {
     TextBuffer out;
-    texts_[cell.variable].append(out, totals[cell.variable], cell.kind, QStringView());
+    texts_[cell.variable].append(out, totals[cell.variable], cell.kind, groups_.variables[cell.variable].suffix);
     return out.view().trimmed().toString();
 }
 
@@ -56,7 +68,10 @@ QString GroupedTable::totalText(const TotalCell &cell, const Totals &totals) con
 qint64 GroupedTable::pageEndHeight() const
 {
     const std::vector<TotalLine> &lines = groups_.pageTotals;
-    const auto height = static_cast<qint64>(linesOf(lines, pageTotals_, 0, nullptr).size());
+    qint64 height = 0;
+    for (const QString &line : linesOf(lines, pageTotals_, 0, nullptr)) {
+        height += KeptLines::heightOf(line);
+    }
     // A label with a number in it may find no room beside the totals later on.
     return height + std::count_if(lines.begin(), lines.end(),
                                   [](const TotalLine &line) { return !line.cells.empty() && line.label.needsRows(); });
@@ -76,8 +91,9 @@ std::vector<QString> GroupedTable::linesOf(const std::vector<TotalLine> &lines, 
             done.push_back(label);
             continue;
         }
-        QString text = lineOf(line, totals, label);
-        if (!label.isEmpty() && !text.startsWith(label)) {
+        bool hasLabel = label.isEmpty();
+        QString text = lineOf(line, totals, label, hasLabel);
+        if (!hasLabel) {
             done.push_back(label);
         }
         done.push_back(std::move(text));
@@ -131,7 +147,8 @@ QString GroupedTable::ruleOf(const std::vector<TotalLine> &lines) const
 }
 
 /// A line of totals with its label in front of the first of them, where that has room.
-QString GroupedTable::lineOf(const TotalLine &line, const Totals &totals, const QString &label) const
+/// @param hasLabel  becomes true where the label is in it
+QString GroupedTable::lineOf(const TotalLine &line, const Totals &totals, const QString &label, bool &hasLabel) const
 {
     TextBuffer out;
     std::optional<std::size_t> room;
@@ -140,6 +157,7 @@ QString GroupedTable::lineOf(const TotalLine &line, const Totals &totals, const 
         if (cell == nullptr) {
             if (options_.separator == u'\t' && field == 0) {
                 out.append(label);
+                hasLabel = true;
             } else {
                 columns_[field].appendBlank(out);
             }
@@ -149,7 +167,7 @@ QString GroupedTable::lineOf(const TotalLine &line, const Totals &totals, const 
         const Shown shown = columns_[field].append(out, totals[cell->variable], cell->kind, suffix);
         if (shown == Shown::TooWide && remarks_.rows != 0) {
             wideTotalRow_ = remarks_.rows;
-            remarks_.add(remarks_.columns[field].tooWide, wideTotalRow_ - 1);
+            remarks_.add(remarks_.columns[field].wideTotals, wideTotalRow_ - 1);
             remarks_.takeNew();
         }
     });
@@ -157,6 +175,7 @@ QString GroupedTable::lineOf(const TotalLine &line, const Totals &totals, const 
     const qsizetype blanks = room && *room > 0 ? static_cast<qsizetype>(*room) - 1 : 0; // one stays before the total
     if (options_.separator != u'\t' && !label.isEmpty() && label.size() <= blanks) {
         text.replace(0, label.size(), label);
+        hasLabel = true;
     }
     return text;
 }
@@ -172,6 +191,7 @@ std::vector<ResultTotal> GroupedTable::resultsOf(const TotalLine &line, const To
             TextBuffer text;
             texts_[cell->variable].append(text, totals[cell->variable], cell->kind, suffix);
             result.text = text.view().trimmed().toString();
+            result.total = resultKind(cell->kind);
             const auto number = cells_[cell->variable].internal(totals[cell->variable], cell->kind);
             const bool isWhole = fields_[field].Type == VARIABLE_INTEGER;
             constexpr double mostWhole = std::numeric_limits<qint32>::max();
@@ -186,7 +206,7 @@ std::vector<ResultTotal> GroupedTable::resultsOf(const TotalLine &line, const To
 }
 
 /// Hands lines of totals on. A label stands in the first column where that shows texts, else on a line of its own.
-void GroupedTable::giveTotals(ResultRowKind kind, const std::vector<TotalLine> &lines, const Totals &totals,
+void GroupedTable::giveTotals(const TotalsOf &of, const std::vector<TotalLine> &lines, const Totals &totals,
                               quint64 rows, const UDataObject *object)
 {
     if (!givesResults()) {
@@ -201,10 +221,10 @@ void GroupedTable::giveTotals(ResultRowKind kind, const std::vector<TotalLine> &
         if (hasRoom && !line.cells.empty()) {
             results.front().text = label;
         } else if (!label.isEmpty()) {
-            results_->addText(ResultText::GroupFooter, label);
+            results_->addText(ResultText::GroupFooter, label, of.level);
         }
         if (!line.cells.empty()) {
-            results_->addTotals(kind, std::move(results));
+            results_->addTotals(of.kind, std::move(results), of.level);
         }
     }
 }

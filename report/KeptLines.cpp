@@ -2,15 +2,23 @@
 
 #include "ReportOutline.h"
 
+#include <algorithm>
+#include <numeric>
+
 namespace kareport
 {
+
+qint64 KeptLines::heightOf(QStringView text)
+{
+    return 1 + text.count(u'\n');
+}
 
 void KeptLines::add(const Line &line, QStringView text)
 {
     if (!line.isBound && open_ == 0 && !lines_.empty()) {
         writeHeld(nullptr);
     }
-    lines_.push_back({line, text_.size(), text.size()});
+    lines_.push_back({line, text_.size(), text.size(), heightOf(text)});
     text_.append(text);
 }
 
@@ -21,7 +29,7 @@ std::size_t KeptLines::addOpen(const Line &line)
     }
     ++open_;
     texts_.emplace_back();
-    lines_.push_back({line, texts_.size() - 1, -1});
+    lines_.push_back({line, texts_.size() - 1, -1, 0});
     return texts_.size() - 1;
 }
 
@@ -59,8 +67,57 @@ void KeptLines::writeHeld(const std::vector<QString> *more)
 
 void KeptLines::writeTogether(std::size_t begin, std::size_t end, const std::vector<QString> *more)
 {
-    place(begin, heightOf(begin, end) + reserved_ + (more != nullptr ? static_cast<qint64>(more->size()) : 0));
+    const qint64 after = reserved_ + (more != nullptr ? heightOf(*more) : 0);
+    place(begin, heightOf(begin, end) + after);
     const bool isLast = more != nullptr && more->empty() && reserved_ == 0;
+    if (heightOf(begin, end) + after <= page_.linesLeft()) {
+        writePart(begin, end, isLast);
+    } else {
+        writeParts(begin, end, after, isLast);
+    }
+    if (more == nullptr || isLast) {
+        return;
+    }
+    std::vector<QString> last = hooks_.pageEnd();
+    last.insert(last.end(), more->begin(), more->end());
+    for (std::size_t i = 0; i < last.size(); ++i) {
+        writeLine(last[i], 0, i + 1 == last.size());
+    }
+}
+
+/// Writes lines that no page has room for together: the headings before a row and the totals after it still stay with it.
+/// @param after  lines that follow the last of them @param isLast  nothing follows them
+void KeptLines::writeParts(std::size_t begin, std::size_t end, qint64 after, bool isLast)
+{
+    for (std::size_t part = begin; part < end;) {
+        const std::size_t next = endOfPart(part, end);
+        const qint64 height = heightOf(part, next) + (next == end ? after : reserved_);
+        if (part > begin && height > page_.linesLeft() && !isAtTop()) {
+            endPage();
+        }
+        writePart(part, next, isLast && next == end);
+        part = next;
+    }
+}
+
+/// Where a part ends that stays together on a small page as well: after a row and the totals under it.
+std::size_t KeptLines::endOfPart(std::size_t begin, std::size_t end) const
+{
+    std::size_t at = begin;
+    while (at < end && lines_[at].line.row == 0) {
+        ++at;
+    }
+    at = std::min(at + 1, end);
+    while (at < end && lines_[at].line.row == 0 && lines_[at].line.group < 0) {
+        ++at;
+    }
+    return at;
+}
+
+/// Writes lines one after the other. Where the page ends before them, they go on on the next one.
+/// @param isLast  nothing follows them
+void KeptLines::writePart(std::size_t begin, std::size_t end, bool isLast)
+{
     for (std::size_t i = begin; i < end; ++i) {
         const Held &held = lines_[i];
         if (i > begin && reserved_ >= page_.linesLeft() && !isAtTop()) {
@@ -73,14 +130,6 @@ void KeptLines::writeTogether(std::size_t begin, std::size_t end, const std::vec
         if (held.line.row != 0) {
             hooks_.rowWritten(held.line);
         }
-    }
-    if (more == nullptr || isLast) {
-        return;
-    }
-    std::vector<QString> last = hooks_.pageEnd();
-    last.insert(last.end(), more->begin(), more->end());
-    for (std::size_t i = 0; i < last.size(); ++i) {
-        writeLine(last[i], 0, i + 1 == last.size());
     }
 }
 
@@ -104,9 +153,16 @@ qint64 KeptLines::heightOf(std::size_t begin, std::size_t end) const
     qint64 lines = 0;
     for (std::size_t i = begin; i < end; ++i) {
         const bool isDropped = i == begin && (!hasBegun_ || isAtTop());
-        lines += 1 + (isDropped ? 0 : lines_[i].line.before);
+        const Held &held = lines_[i];
+        lines += (held.size < 0 ? heightOf(textOf(held)) : held.height) + (isDropped ? 0 : held.line.before);
     }
     return lines;
+}
+
+qint64 KeptLines::heightOf(const std::vector<QString> &lines)
+{
+    return std::accumulate(lines.begin(), lines.end(), qint64(0),
+                           [](qint64 height, const QString &line) { return height + heightOf(line); });
 }
 
 void KeptLines::writeLine(QStringView text, int before, bool isLast)

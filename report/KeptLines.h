@@ -49,6 +49,8 @@ public:
     /// Adds a line whose text is not known yet. Nothing is written before it is. @return what `setText` is told
     std::size_t addOpen(const Line &line);
     void setText(std::size_t open, QString text);
+    /// How many lines a text takes: those of the data may have line breaks.
+    static qint64 heightOf(QStringView text);
     /// Writes what is left, the lines of the page's end and then some more, all of which stay with the last lines. The heading
     /// does not follow the last of them to another page.
     void finish(const std::vector<QString> &more);
@@ -59,15 +61,20 @@ private:
         Line line;
         std::size_t start; ///< of its text in `text_`
         qsizetype size;    ///< -1 for a text in `texts_`
+        qint64 height;     ///< lines that the text takes, where it is known
     };
 
     void writeHeld(const std::vector<QString> *more);
     void writeTogether(std::size_t begin, std::size_t end, const std::vector<QString> *more);
+    void writeParts(std::size_t begin, std::size_t end, qint64 after, bool isLast);
+    void writePart(std::size_t begin, std::size_t end, bool isLast);
+    std::size_t endOfPart(std::size_t begin, std::size_t end) const;
     void place(std::size_t begin, qint64 lines);
     void writeLine(QStringView text, int before, bool isLast);
     void endPage();
     void noteTop();
     qint64 heightOf(std::size_t begin, std::size_t end) const;
+    static qint64 heightOf(const std::vector<QString> &lines);
     QStringView textOf(const Held &held) const;
     bool isAtTop() const { return page_.pageNumber() == topPage_ && page_.lineNumber() == topLine_; }
 

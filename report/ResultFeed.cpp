@@ -60,13 +60,14 @@ void ResultFeed::begin(ResultTable &table)
     ends_.clear();
 }
 
-void ResultFeed::beginTable(const UXmlReportTable &table, const QString &chainageLabel)
+void ResultFeed::beginTable(const UXmlReportTable &table, const QString &chainageLabel, bool addsPrinted)
 {
     if (sink_ == nullptr) {
         return;
     }
     ResultTable result;
     result.name = table.GetTableName();
+    result.addsPrinted = addsPrinted;
     result.columns = columnsOf(table);
     const QString word = chainageWordOf(table.GetHeading());
     for (ResultColumn &column : result.columns) {
@@ -114,7 +115,7 @@ void ResultFeed::skip()
     ends_.push_back(texts_.size());
 }
 
-void ResultFeed::endRow(const UDataObject &object)
+void ResultFeed::endRow(const UDataObject &object, int level)
 {
     std::size_t start = 0;
     for (std::size_t i = 0; i < ends_.size(); ++i) {
@@ -123,6 +124,7 @@ void ResultFeed::endRow(const UDataObject &object)
         start = ends_[i];
     }
     row_.object = &object;
+    row_.level = level;
     sink_->addRow(row_);
     dropRow();
 }
@@ -133,15 +135,17 @@ void ResultFeed::dropRow()
     ends_.clear();
 }
 
-void ResultFeed::addTotals(ResultRowKind kind, const std::vector<ResultTotal> &totals)
+void ResultFeed::addTotals(ResultRowKind kind, const std::vector<ResultTotal> &totals, int level)
 {
     std::vector<UDictEntry> entries;
     entries.reserve(totals.size()); // the cells point into it
     ResultRow row;
     row.kind = kind;
+    row.level = level;
     for (const ResultTotal &total : totals) {
         ResultCell &cell = row.cells.emplace_back();
         cell.text = total.text;
+        cell.total = total.total;
         if (total.kind == ResultTotal::Kind::Number) {
             cell.value = &entries.emplace_back(0U, total.number);
         } else if (total.kind == ResultTotal::Kind::Whole) {

@@ -24,6 +24,7 @@ struct ResultTotal
     Kind kind = Kind::None;
     double number = 0;
     QString text; ///< as the report shows it, without the blanks that fill the column
+    ResultTotalKind total = ResultTotalKind::None;
 };
 
 /// Hands the values of a table or a block to a sink of results while they are formatted.
@@ -33,7 +34,8 @@ public:
     /// @param sink  null where nobody wants results: then nothing is done
     ResultFeed(ResultSink *sink, const FormatOptions &options) : sink_(sink), options_(options) {}
 
-    void beginTable(const UXmlReportTable &table, const QString &chainageLabel);
+    /// @param addsPrinted  as `ResultTable` has it
+    void beginTable(const UXmlReportTable &table, const QString &chainageLabel, bool addsPrinted);
     void beginBlock(const UXmlReportBlock &block);
     /// Whether rows are wanted.
     bool isOpen() const { return isOpen_; }
@@ -44,13 +46,14 @@ public:
     void take(const FieldFormatter &field, const UDictEntry *entry, QStringView suffix, QStringView shown, Shown how);
     /// Leaves the next column of a row without a value and without a text.
     void skip();
-    void endRow(const UDataObject &object);
+    /// @param level  the first one of groups that begins with the row
+    void endRow(const UDataObject &object, int level = ResultRow::noLevel);
     /// Forgets what was taken of a row.
     void dropRow();
-    /// A line of text in a table.
-    void addText(ResultText kind, QStringView text) { sink_->addText(kind, text, 0); }
-    /// A row of totals. @param totals  one for each column without a marker
-    void addTotals(ResultRowKind kind, const std::vector<ResultTotal> &totals);
+    /// A line of text in a table. @param level  of the group that it heads, from 0
+    void addText(ResultText kind, QStringView text, int level) { sink_->addText(kind, text, level); }
+    /// A row of totals. @param totals  one for each column without a marker @param level  of their group
+    void addTotals(ResultRowKind kind, const std::vector<ResultTotal> &totals, int level);
     void endTable();
 
 private:

@@ -6,6 +6,7 @@
 #include <QString>
 #include <QStringView>
 
+#include <limits>
 #include <vector>
 
 class UDataObject;
@@ -32,8 +33,20 @@ struct ResultTable
 {
     QString name; ///< of a table; that of a block is known to who opens its data
     bool isTable = true;
+    bool addsPrinted = false;               ///< whether its totals add the digits that are printed
     const UJobSettings *settings = nullptr; ///< units and formats of what is shown; valid until the table ends
     std::vector<ResultColumn> columns;      ///< without markers
+};
+
+/// What a total says of the values above it.
+enum class ResultTotalKind
+{
+    None, ///< it is no total
+    Sum,
+    Mean,
+    Least,
+    Greatest,
+    Count
 };
 
 /// A value with its text.
@@ -43,6 +56,7 @@ struct ResultCell
     /// The text that the report shows for it, without the blanks that fill the column, and whole where the report has "#".
     /// Of a block's line that is left out, none.
     QStringView text;
+    ResultTotalKind total = ResultTotalKind::None; ///< not None in a row of totals alone
 };
 
 /// What a row is.
@@ -58,6 +72,10 @@ struct ResultRow
     ResultRowKind kind = ResultRowKind::Row;
     const UDataObject *object = nullptr; ///< that the values are of; null where there is none
     std::vector<ResultCell> cells;       ///< one for each column
+    static constexpr int noLevel = std::numeric_limits<int>::max();
+    /// Of groups, from 0 for the outermost one. Of a row, the first one that a new group of begins with; of totals of a group,
+    /// that of the group.
+    int level = noLevel;
 };
 
 /// What a line of text in a report is.
@@ -83,7 +101,8 @@ public:
     virtual bool beginTable(const ResultTable &table) = 0;
     virtual void addRow(const ResultRow &row) = 0;
     virtual void endTable() = 0;
-    /// A line of text, which may be in a table. @param style  0 plain, 1 bold, 2 underlined, 3 both
+    /// A line of text, which may be in a table.
+    /// @param style  0 plain, 1 bold, 2 underlined, 3 both; of the heading of a group, its level, from 0
     virtual void addText(ResultText kind, QStringView text, int style) = 0;
 };
 

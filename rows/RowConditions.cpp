@@ -1,6 +1,5 @@
 #include "RowConditions.h"
 
-#include "DecimalSum.h"
 #include "EntryOrder.h"
 #include "Measures.h"
 #include "VariableType.h"
@@ -13,20 +12,6 @@ namespace kareport
 
 namespace
 {
-
-/// By how much one number is greater than another one, without the error of subtracting what is not decimal.
-double difference(CellReader &reader, double left, double right)
-{
-    if (!std::isfinite(left) || !std::isfinite(right)) {
-        return left - right;
-    }
-    DecimalSum sum;
-    sum.add(reader.read(left));
-    CellDecimal other = reader.read(right);
-    other.digits = -other.digits;
-    sum.add(other);
-    return sum.toDouble() * reader.factor();
-}
 
 bool isOneOf(const UDictEntry *entry, const std::vector<UDictEntry> &values)
 {
@@ -59,7 +44,8 @@ bool RowCondition::holds(const UDataObject &object)
     std::optional<double> number = numberOf(entry);
     if (number && beside) {
         const auto other = numberOf(object.Find(*beside));
-        number = other ? std::optional(difference(reader, *number, *other)) : std::nullopt;
+        number =
+            other ? std::optional(reader.internal(countedDifference(reader, *number, *other, turn))) : std::nullopt;
     }
     if (!number) {
         return false;

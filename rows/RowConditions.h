@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CellDecimal.h"
+#include "Differences.h"
 #include "UDataObject.h"
 
 #include <QString>
@@ -29,7 +30,8 @@ struct RowCondition
     std::vector<UDictEntry> values; ///< of `Is` and `IsNot`
     double limit = 0;               ///< internal, of the other ones
     std::optional<quint32> beside;  ///< what is compared is by how much the value differs from this one
-    CellReader reader;              ///< of both values, in the data's unit
+    CellReader reader;              ///< of both values
+    std::optional<Turn> turn;       ///< where both are directions
 
     /// Whether a row fulfils it. A value that is missing or not-a-number is beyond no limit.
     bool holds(const UDataObject &object);

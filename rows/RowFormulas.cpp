@@ -8,6 +8,7 @@
 #include <cstdlib>
 #include <limits>
 #include <numbers>
+#include <numeric>
 #include <optional>
 
 namespace kareport
@@ -54,38 +55,37 @@ bool areFinite(const std::vector<double> &numbers)
     return std::all_of(numbers.begin(), numbers.end(), [](double number) { return std::isfinite(number); });
 }
 
-/// The sum of the numbers in the data's unit, of which those after the first are subtracted where the sign is -1.
-double sumOf(Operands &operands, const std::vector<double> &numbers, int sign)
+/// The sum of the numbers, as they are counted.
+double sumOf(Operands &operands, const std::vector<double> &numbers)
 {
     DecimalSum sum;
     for (std::size_t i = 0; i < numbers.size(); ++i) {
-        CellDecimal number = operands[i].reader.read(numbers[i]);
-        number.digits = i > 0 ? number.digits * sign : number.digits;
-        sum.add(number);
+        sum.add(operands[i].reader.read(numbers[i]));
     }
     return sum.toDouble();
 }
 
-double plainSum(const std::vector<double> &numbers, int sign)
+/// How far the second point is from the first one in each direction, as it is counted.
+std::vector<double> stepsOf(Operands &operands, const std::vector<double> &numbers)
 {
-    double sum = numbers.front();
-    for (std::size_t i = 1; i < numbers.size(); ++i) {
-        sum += sign * numbers[i];
-    }
-    return sum;
-}
-
-double distance(const std::vector<double> &numbers)
-{
+    std::vector<double> steps;
     const std::size_t half = numbers.size() / 2;
-    return half == 2 ? std::hypot(numbers[2] - numbers[0], numbers[3] - numbers[1])
-                     : std::hypot(numbers[3] - numbers[0], numbers[4] - numbers[1], numbers[5] - numbers[2]);
+    steps.reserve(half);
+    for (std::size_t i = 0; i < half; ++i) {
+        steps.push_back(countedDifference(operands[i].reader, numbers[half + i], numbers[i]));
+    }
+    return steps;
 }
 
-/// Clockwise from north, from 0 to below a whole circle.
-double bearing(const std::vector<double> &numbers)
+double lengthOf(const std::vector<double> &steps)
 {
-    const double angle = std::atan2(numbers[3] - numbers[1], numbers[2] - numbers[0]);
+    return steps.size() == 2 ? std::hypot(steps[0], steps[1]) : std::hypot(steps[0], steps[1], steps[2]);
+}
+
+/// Clockwise from north, from 0 to below a whole circle. @param steps  northwards and eastwards
+double bearing(const std::vector<double> &steps)
+{
+    const double angle = std::atan2(steps[1], steps[0]);
     return angle < 0 ? angle + 2 * std::numbers::pi : angle;
 }
 
@@ -114,22 +114,24 @@ void RowFormula::setValue(UDataObject &object)
         return;
     }
     const bool isExact = areFinite(*numbers);
-    const int sign = kind == Kind::Difference ? -1 : 1;
     double value = 0;
     switch (kind) {
     case Kind::Sum:
+        value = isExact ? result.internal(sumOf(operands, *numbers))
+                        : std::accumulate(numbers->begin(), numbers->end(), 0.0);
+        break;
     case Kind::Difference:
-        value = isExact ? sumOf(operands, *numbers, sign) * result.factor() : plainSum(*numbers, sign);
+        value = result.internal(countedDifference(operands[0].reader, (*numbers)[0], (*numbers)[1], turn));
         break;
     case Kind::Product:
-        value = isExact ? product(operands[0].reader.read((*numbers)[0]), operands[1].reader.read((*numbers)[1])) *
-                              productFactor
+        value = isExact ? product(operands[0].reader.read((*numbers)[0]), operands[1].reader.read((*numbers)[1])) /
+                              productPerUnit * productFactor
                         : (*numbers)[0] * (*numbers)[1];
         break;
-    case Kind::Distance: value = distance(*numbers); break;
-    case Kind::Bearing: value = bearing(*numbers); break;
+    case Kind::Distance: value = result.internal(lengthOf(stepsOf(operands, *numbers))); break;
+    case Kind::Bearing: value = bearing(stepsOf(operands, *numbers)); break;
     }
-    storeNumber(object, target, value, isWhole);
+    storeNumber(object, target, direction ? wrapped(value, *direction) : value, isWhole);
 }
 
 } // namespace kareport

@@ -1,8 +1,10 @@
 #pragma once
 
 #include "CellDecimal.h"
+#include "Differences.h"
 #include "UDataObject.h"
 
+#include <optional>
 #include <vector>
 
 namespace kareport
@@ -27,9 +29,12 @@ struct RowFormula
     Kind kind = Kind::Sum;
     std::vector<Operand> operands;
     quint32 target = 0;
-    bool isWhole = false;     ///< the target holds whole numbers
-    double productFactor = 1; ///< what a product of numbers of the data is multiplied by to become internal
-    CellReader result;        ///< of the target, in the data's unit
+    bool isWhole = false;          ///< the target holds whole numbers
+    double productFactor = 1;      ///< what a product of numbers of the data is multiplied by to become internal
+    int productPerUnit = 1;        ///< what a product of units of the data is counted as
+    CellReader result;             ///< of the target
+    std::optional<Turn> turn;      ///< of a difference of directions
+    std::optional<Turn> direction; ///< of a target that is a direction: what is beyond a whole turn is taken off
 
     /// Gives a row its value. It has none where an operand is missing.
     void setValue(UDataObject &object);

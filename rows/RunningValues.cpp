@@ -1,5 +1,6 @@
 #include "RunningValues.h"
 
+#include "Differences.h"
 #include "EntryOrder.h"
 #include "RowFormulas.h"
 #include "VariableType.h"
@@ -11,30 +12,38 @@ namespace kareport
 
 void RunningValue::restart()
 {
+    begin();
+    leftOut_ = LeftOut();
+}
+
+void RunningValue::begin()
+{
     sum_.clear();
     before_.reset();
     row_ = 0;
 }
 
-void RunningValue::setValue(UDataObject &object, bool beginsGroup)
+void RunningValue::setValue(UDataObject &object, bool beginsGroup, quint64 row)
 {
     if (beginsGroup && perGroup_) {
-        restart();
+        begin();
     }
     switch (kind_) {
-    case Kind::Sum: setSum(object); break;
+    case Kind::Sum: setSum(object, row); break;
     case Kind::Difference: setDifference(object); break;
     case Kind::RowNumber: setRowNumber(object); break;
     }
 }
 
-void RunningValue::setSum(UDataObject &object)
+void RunningValue::setSum(UDataObject &object, quint64 row)
 {
     const auto number = numberOf(object.Find(source_));
     if (number && std::isfinite(*number)) {
         sum_.add(reader_.read(*number));
+    } else {
+        leftOut_.add(!number, row);
     }
-    storeNumber(object, target_.id, sum_.toDouble() * reader_.factor(), target_.type == VARIABLE_INTEGER);
+    storeNumber(object, target_.id, reader_.internal(sum_.toDouble()), target_.type == VARIABLE_INTEGER);
 }
 
 void RunningValue::setDifference(UDataObject &object)
@@ -42,15 +51,9 @@ void RunningValue::setDifference(UDataObject &object)
     const auto number = numberOf(object.Find(source_));
     if (!number || !before_) {
         object.Remove(target_.id);
-    } else if (!std::isfinite(*number) || !std::isfinite(*before_)) {
-        storeNumber(object, target_.id, *number - *before_, target_.type == VARIABLE_INTEGER);
     } else {
-        DecimalSum difference;
-        difference.add(reader_.read(*number));
-        CellDecimal before = reader_.read(*before_);
-        before.digits = -before.digits;
-        difference.add(before);
-        storeNumber(object, target_.id, difference.toDouble() * reader_.factor(), target_.type == VARIABLE_INTEGER);
+        const double difference = reader_.internal(countedDifference(reader_, *number, *before_));
+        storeNumber(object, target_.id, difference, target_.type == VARIABLE_INTEGER);
     }
     before_ = number;
 }

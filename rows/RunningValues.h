@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CellDecimal.h"
+#include "ColumnTotal.h"
 #include "DecimalSum.h"
 #include "UDataObject.h"
 
@@ -33,11 +34,15 @@ public:
 
     /// Begins again with the first row.
     void restart();
-    /// Gives the next row its value.
-    void setValue(UDataObject &object, bool beginsGroup);
+    /// Gives the next row its value. @param row  of the table, from 1
+    void setValue(UDataObject &object, bool beginsGroup, quint64 row);
+    /// The values that are in no sum.
+    const LeftOut &leftOut() const { return leftOut_; }
+    quint32 source() const { return source_; }
 
 private:
-    void setSum(UDataObject &object);
+    void begin();
+    void setSum(UDataObject &object, quint64 row);
     void setDifference(UDataObject &object);
     void setRowNumber(UDataObject &object);
 
@@ -49,6 +54,7 @@ private:
     DecimalSum sum_;
     std::optional<double> before_;
     quint64 row_ = 0;
+    LeftOut leftOut_;
 };
 
 } // namespace kareport

@@ -78,7 +78,7 @@ bool ShownRows::readNext()
     findNewLevel(*current_);
     ++shown_;
     for (RunningValue &value : shape_.running) {
-        value.setValue(*current_, firstNewLevel_ < keys_.size());
+        value.setValue(*current_, firstNewLevel_ < keys_.size(), shown_);
     }
     setFlags(shape_.flags, *current_);
     return true;

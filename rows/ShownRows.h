@@ -46,6 +46,8 @@ public:
     const TableGroups &groups() const override { return shape_.groups; }
     std::size_t firstNewLevel() const override { return firstNewLevel_; }
     void noteLeftOut(std::vector<LeftOut> variables) override { leftOut_ = std::move(variables); }
+    /// The variables of running values, with what is in no sum of them.
+    const std::vector<RunningValue> &running() const { return shape_.running; }
     /// The values that are in no total of the table that was written.
     const std::vector<LeftOut> &leftOut() const { return leftOut_; }
 

@@ -22,7 +22,8 @@ LENGTHS = {"m": Fraction(1), "mm": Fraction("0.001"), "km": Fraction(1000), "ft"
            "usft": Fraction(1200, 3937)}
 AREAS = {"m2": Fraction(1), "ha": Fraction(10000), "km2": Fraction(10 ** 6), "ft2": Fraction("0.09290304"),
          "ac": Fraction("4046.8564224")}
-ANGLES = {"deg": Fraction(1, 360), "gon": Fraction(1, 400), "rad": 1 / (2 * PI)}
+ANGLES = {"deg": Fraction(1, 360), "gon": Fraction(1, 400), "rad": 1 / (2 * PI), "dms": Fraction(1, 360)}
+KINDS = {"S": "sum", "M": "mean", "I": "min", "A": "max", "N": "count"}  # by the labels of their lines
 COLUMNS = [("Number", "DOUBLE", None), ("Length", "LENGTH", LENGTHS), ("Area", "AREA", AREAS), ("Angle", "ANGLE", ANGLES)]
 ANGLE_DECIMALS = 4
 
@@ -54,18 +55,35 @@ def cell(numbers):
     return ("-" if numbers.randrange(3) == 0 else "") + text
 
 
+def angle(numbers, unit):
+    """An angle, where the data has such in degrees, minutes and seconds."""
+    if unit != "dms" or numbers.randrange(4) == 0:
+        return cell(numbers)
+    seconds = str(numbers.randrange(60)) + numbers.choice(("", f".{numbers.randrange(10)}", f".{numbers.randrange(10000):04}"))
+    sign = "-" if numbers.randrange(3) == 0 else ""
+    return f"{sign}{numbers.randrange(400)}-{numbers.randrange(60)}-{seconds}"
+
+
+def value(text):
+    """The number that a cell says."""
+    parts = text.lstrip("-").split("-")
+    number = sum(Fraction(part) / 60 ** i for i, part in enumerate(parts))
+    return -number if text.startswith("-") else number
+
+
 def write(folder, seed):
     """A job of a seed and its rows."""
     numbers = random.Random(seed)
     count = numbers.choice((0, 1, 2, 10, 40))
-    rows = [[f"g{numbers.randrange(4)}"] + [cell(numbers) for _ in COLUMNS] for _ in range(count)]
     units = {"length": numbers.choice(list(LENGTHS)), "area": numbers.choice(list(AREAS)),
              "angle": numbers.choice(list(ANGLES))}
+    rows = [[f"g{numbers.randrange(4)}"] + [cell(numbers) for _ in COLUMNS[:-1]] + [angle(numbers, units["angle"])]
+            for _ in range(count)]
     shown = {"lengthUnit": numbers.choice(list(LENGTHS)), "areaUnit": numbers.choice(list(AREAS)),
-             "angleUnit": numbers.choice(list(ANGLES)), "lengthDecimals": numbers.randrange(7),
+             "angleUnit": numbers.choice(("deg", "gon", "rad")), "lengthDecimals": numbers.randrange(7),
              "numberDecimals": numbers.randrange(7)}
     names = [name for name, _, _ in COLUMNS]
-    lines = [{"label": "S", "sum": names}, {"label": "M", "mean": names}]
+    lines = [{"label": label, kind: names} for label, kind in KINDS.items()]
     job = {"now": "2024-03-05T14:07:00", "header": False, "page": {"linesPerPage": 100000, "charsPerRow": 80},
            "settings": shown, "template": {"file": "t.xml", "name": "T"},
            "data": {"d": {"csv": f"{seed}.csv", "units": units}},
@@ -92,13 +110,18 @@ def ratio(index, job):
     return units[job["data"]["d"]["units"][key]] / units[job["settings"][f"{key}Unit"]]
 
 
-def expected(index, job, rows, printed, is_mean):
+def expected(index, job, rows, printed, kind):
     """The digits of a total; nothing where there is none."""
-    values = [(Decimal(row[index + 1]), text) for row, text in zip(rows, printed) if row[index + 1]]
+    values = [(value(row[index + 1]), text) for row, text in zip(rows, printed) if row[index + 1]]
+    if kind == "count":
+        return str(len(values))
+    if kind in ("min", "max"):  # as it is printed in its row
+        return (min if kind == "min" else max)(values, key=lambda each: each[0])[1] if values else ""
+    is_mean = kind == "mean"
     if job["report"][0]["rounding"] == "printed":
         total = Fraction(sum((Decimal(text) for _, text in values), Decimal(0)))
     else:
-        total = Fraction(sum((value for value, _ in values), Decimal(0))) * ratio(index, job)
+        total = sum((number for number, _ in values), Fraction(0)) * ratio(index, job)
     if is_mean:
         if not values:
             return ""
@@ -117,19 +140,18 @@ def check(folder, seed, job, rows):
     shown = [line for line in shown if len(line) == len(COLUMNS) + 1 and not line[1].startswith("-----")]
     shown = [line for line in shown if line[0] != "G"]
     printed = [line for line in shown if line[0].startswith("g")]
-    totals = [line for line in shown if line[0] in "SM"]
+    totals = [line for line in shown if line[0] in KINDS]
     assert len(printed) == len(rows), f"{seed}: {len(printed)} rows"
     groups = [list(range(len(rows)))] if rows else []
     groups = [[i for i in range(len(rows)) if rows[i][0] == key] for key in sorted({row[0] for row in rows})] + groups
-    assert len(totals) == 2 * len(groups), f"{seed}: {len(totals)} lines of totals"
+    assert len(totals) == len(KINDS) * len(groups), f"{seed}: {len(totals)} lines of totals"
     for number, group in enumerate(groups):
-        for is_mean in (False, True):
-            line = totals[2 * number + is_mean]
+        for offset, kind in enumerate(KINDS.values()):
+            line = totals[len(KINDS) * number + offset]
             for index, (name, _, _) in enumerate(COLUMNS):
-                wanted = expected(index, job, [rows[i] for i in group], [printed[i][index + 1] for i in group], is_mean)
-                assert line[index + 1] == wanted, f"{seed}: {'mean' if is_mean else 'sum'} of {name}: {line[index + 1]}, " \
-                                                  f"not {wanted}"
-    return 2 * len(COLUMNS) * len(groups)
+                wanted = expected(index, job, [rows[i] for i in group], [printed[i][index + 1] for i in group], kind)
+                assert line[index + 1] == wanted, f"{seed}: {kind} of {name}: {line[index + 1]}, not {wanted}"
+    return len(KINDS) * len(COLUMNS) * len(groups)
 
 
 def main():

@@ -1,6 +1,7 @@
 #include "JobExport.h"
 
 #include "DeskPreferences.h"
+#include "HtmlResult.h"
 #include "Interrupt.h"
 #include "JobFiles.h"
 #include "JobOutputs.h"
@@ -11,6 +12,9 @@
 #include "SizeLimit.h"
 #include "UReportDoc.h"
 #include "Xlate.h"
+
+#include <QFile>
+#include <QFileInfo>
 
 #include <limits>
 #include <new>
@@ -39,6 +43,24 @@ QString wrongExport(const Job &job, const QString &path)
     return wrong ? wrong->text : QString();
 }
 
+/// What keeps the further pages of a web page from being written: nobody was asked whether they may replace other files.
+/// @param pages  the first one, then the others
+QString wrongPage(const std::vector<Output> &pages)
+{
+    constexpr qint64 longestHead = 16 * 1024;
+    for (std::size_t i = 1; i < pages.size(); ++i) {
+        QFile file(pages[i].file);
+        const bool isOurs = !file.exists() || (file.open(QIODevice::ReadOnly) &&
+                                               HtmlResult::isPage(file.read(longestHead),
+                                                                  QFileInfo(pages.front().file).fileName(), i + 1));
+        if (!isOurs) {
+            return Xlate("\"%1\" is there already, and is no page of \"%2\": another name was expected")
+                .arg(pages[i].file, pages.front().file);
+        }
+    }
+    return {};
+}
+
 QString writeExport(const Job &job, const JsonSource &source, Progress &progress, QStringList &warnings)
 {
     UReportDoc report(surroundingsOf(job));
@@ -58,6 +80,9 @@ QString writeExport(const Job &job, const JsonSource &source, Progress &progress
     }
     if (const auto clash = outputClash(job, all, source.path())) {
         return clash->text;
+    }
+    if (const QString problem = wrongPage(all); !problem.isEmpty()) {
+        return problem;
     }
     const OutputResult written =
         writeOutput(report, job.outputs.front(), progress, results.fileOf(job.outputs.front()));

@@ -81,6 +81,26 @@ TEST(JobExport, WhatGoesWrongIsSaid)
     EXPECT_FALSE(QFile::exists(desk.folder.path("a.csv")));
 }
 
+TEST(JobExport, FurtherPagesReplaceNoOtherFile)
+{
+    ExportingDesk desk;
+    desk.folder.put("job.json", R"({"template": {"file": "t.xml", "name": "T"}, "data": {"p": {"csv": "p.csv"}},
+        "report": [{"table": "Points", "data": "p"}], "output": [{"file": "x.html", "rowsPerPage": 1}]})");
+    desk.folder.put("a-2.html", "<p>a page of its own</p>");
+    ASSERT_TRUE(desk.frame->OpenFile(desk.folder.path("job.json")));
+    desk.exportTo("a.html");
+    ASSERT_EQ(desk.messages.size(), 1);
+    EXPECT_TRUE(desk.messages.first().contains(u"is there already")) << desk.messages.first().toStdString();
+    EXPECT_EQ(desk.folder.bytesOf("a-2.html"), "<p>a page of its own</p>");
+    EXPECT_FALSE(QFile::exists(desk.folder.path("a.html")));
+    ASSERT_TRUE(QFile::remove(desk.folder.path("a-2.html")));
+    for (int turn = 0; turn < 2; ++turn) {
+        desk.exportTo("a.html");
+        EXPECT_EQ(desk.messages.size(), 1) << "a page of an earlier export is replaced";
+        EXPECT_TRUE(desk.folder.bytesOf("a-2.html").contains("7.000"));
+    }
+}
+
 TEST(JobExport, AReportOfNoJobHasNoValues)
 {
     ExportingDesk desk;

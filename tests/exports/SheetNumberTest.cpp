@@ -48,20 +48,24 @@ TEST(SheetNumber, ANumberIsThePrintedOneOrTheOneBehindIt)
         double printed;
         double exact;
         const char *format;
+        const char *exactFormat;
         const char *reason;
     };
     constexpr Row rows[] = {
-        {VARIABLE_COORDINATE, 12.3456, u"12.346", 12.346, 12.3456, "", "three decimals"},
-        {VARIABLE_COORDINATE, -0.0001, u"0.000", 0, -0.0001, "", "a length has no minus before zeros"},
-        {VARIABLE_DOUBLE, -0.0001, u"-0.000", 0, 0, "\"-\"0.000", "a plain number has: its format shows it"},
-        {VARIABLE_STATION, 12345.6789, u"12+345.679", 12345.679, 12345.6789, "",
+        {VARIABLE_COORDINATE, 12.3456, u"12.346", 12.346, 12.3456, "", "", "three decimals"},
+        {VARIABLE_COORDINATE, -0.0001, u"0.000", 0, -0.0001, "", "0.000;0.000", "a length has no minus before zeros"},
+        {VARIABLE_DOUBLE, -0.0001, u"-0.000", 0, -0.0001, "\"-\"0.000", "\"-\"0.000;\"-\"0.000",
+         "a plain number has: its format shows it"},
+        {VARIABLE_STATION, 12345.6789, u"12+345.679", 12345.679, 12345.6789, "", "",
          "the plus of a station is its format's"},
-        {VARIABLE_STATION, -75, u"-0+075.000", -75, -75, "", "below zero"},
-        {VARIABLE_OFFSET, -2.5, u"2.500L", -2.5, -2.5, "", "to the left"},
-        {VARIABLE_OFFSET, 2.5, u"2.500R", 2.5, 2.5, "", "to the right"},
-        {VARIABLE_OFFSET, 0, u"0.000", 0, 0, "0.000", "on the line"},
-        {VARIABLE_OFFSET, 0.0001, u"0.000R", 0, 0, "0.000\"R\"", "next to it: a number of zero has no side"},
-        {VARIABLE_THICKNESS, 250, u"2.500", 2.5, 2.5, "", "held in hundredths"},
+        {VARIABLE_STATION, -75, u"-0+075.000", -75, -75, "", "", "below zero"},
+        {VARIABLE_OFFSET, -2.5, u"2.500L", -2.5, -2.5, "", "", "to the left"},
+        {VARIABLE_OFFSET, 2.5, u"2.500R", 2.5, 2.5, "", "", "to the right"},
+        {VARIABLE_OFFSET, 0, u"0.000", 0, 0, "0.000", "0.000", "on the line"},
+        {VARIABLE_OFFSET, 0.0001, u"0.000R", 0, 0.0001, "0.000\"R\"", "0.000\"R\"",
+         "next to it: a number of zero has no side"},
+        {VARIABLE_OFFSET, -0.0001, u"0.000L", 0, -0.0001, "0.000\"L\"", "0.000\"L\";0.000\"L\"", "on the other side"},
+        {VARIABLE_THICKNESS, 250, u"2.500", 2.5, 2.5, "", "", "held in hundredths"},
     };
     UJobSettings settings;
     for (const Row &row : rows) {
@@ -73,6 +77,7 @@ TEST(SheetNumber, ANumberIsThePrintedOneOrTheOneBehindIt)
         EXPECT_EQ(printed->value, row.printed) << row.reason;
         EXPECT_EQ(exact->value, row.exact) << row.reason;
         EXPECT_EQ(printed->format, row.format) << row.reason;
+        EXPECT_EQ(exact->format, row.exactFormat) << row.reason;
     }
 }
 

@@ -4,6 +4,7 @@
 
 #include <gtest/gtest.h>
 
+#include <limits>
 #include <numbers>
 #include <string>
 
@@ -55,7 +56,7 @@ TEST(CellReader, GivesTheNumberOfTheCellBack)
     for (const auto &row : rows) {
         CellReader reader(row.factor);
         EXPECT_EQ(shown(reader.read(row.cell * row.factor)), row.number) << row.reason;
-        EXPECT_EQ(reader.internal(reader.read(row.cell * row.factor)), row.cell * row.factor) << row.reason;
+        EXPECT_EQ(reader.internal(reader.read(row.cell * row.factor).toDouble()), row.cell * row.factor) << row.reason;
     }
 }
 
@@ -78,8 +79,35 @@ TEST(CellReader, GivesEveryNumberOfFifteenDigitsBack)
     }
 }
 
+TEST(CellReader, CountsDegreesInSeconds)
+{
+    constexpr double degree = std::numbers::pi / 180;
+    const struct
+    {
+        double cell; ///< as the parts of an angle are added when it is read
+        const char *seconds;
+        const char *reason;
+    } rows[] = {
+        {0.0 + 0.0 / 60 + 20.0 / 3600, "2e1", "20 seconds"},
+        {45.0 + 30.0 / 60 + 15.5 / 3600, "1638155e-1", "half a second"},
+        {-(282.0 + 59.0 / 60 + 47.4123 / 3600), "-10187874123e-4", "four decimals, below 0"},
+        {12.0 + 20.2 / 60, "44412e0", "minutes with a decimal"},
+        {45.5, "1638e2", "decimal degrees"},
+        {45.504305555, "163815499998e-6", "many of them"},
+        {180 + (10.0 + 0.0 / 60 + 20.0 / 3600), "68402e1", "S 10 00 20 W"},
+        {360 - (77.0 + 13.0 / 60 + 49.0 / 3600), "1017971e0", "N 77 13 49 W"},
+        {0, "0", "nothing"},
+    };
+    for (const auto &row : rows) {
+        CellReader reader(degree, CellReader::secondsOfDegree);
+        EXPECT_EQ(shown(reader.read(row.cell * degree)), row.seconds) << row.reason;
+    }
+}
+
 TEST(CellDecimal, IsTheNearestDouble)
 {
+    EXPECT_EQ((CellDecimal{-7, 400}.toDouble()), -std::numeric_limits<double>::infinity()) << "beyond all of them";
+    EXPECT_EQ((CellDecimal{7, -400}.toDouble()), 0.0) << "nearer to 0 than all of them";
     EXPECT_EQ((CellDecimal{1, -1}.toDouble()), 0.1);
     EXPECT_EQ((CellDecimal{-1234567890123456789, -30}.toDouble()), -1234567890123456789e-30);
     EXPECT_EQ((CellDecimal{7, 300}.toDouble()), 7e300);

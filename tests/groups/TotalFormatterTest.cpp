@@ -40,7 +40,7 @@ struct Shower
         TotalledCell cell(variable, options, addsPrinted);
         ColumnTotal total;
         for (const double value : values) {
-            const UDictEntry entry(1, value * variable.factor);
+            const UDictEntry entry(1, value * variable.reader.factor());
             cell.add(total, cell.read(&entry));
         }
         TextBuffer out;
@@ -115,6 +115,13 @@ TEST(TotalFormatter, KeepsTheOptions)
     EXPECT_EQ(shower.show({1, -1}, TotalKind::Sum), QStringLiteral("      ")) << "exactly 0";
     EXPECT_EQ(shower.show({0.0001}, TotalKind::Sum), QStringLiteral(" 0.000")) << "only rounded to it";
     EXPECT_EQ(shower.show({}, TotalKind::Count), QStringLiteral("     0")) << "a count says something";
+    Shower stations;
+    stations.variable.field = field(VARIABLE_STATION, 10);
+    stations.settings.stationDecimals = 15;
+    EXPECT_EQ(stations.show({1.25, 0.1}, TotalKind::Sum), QStringLiteral("0+001.350000000000000"));
+    EXPECT_EQ(stations.show({-1234.25}, TotalKind::Sum), QStringLiteral("-1+234.250000000000000"));
+    stations.settings.stationFormat = UJobSettings::StationFormat::HundredsPlus;
+    EXPECT_EQ(stations.show({12.5}, TotalKind::Sum), QStringLiteral("0+12.500000000000000"));
     shower.printHash = true;
     EXPECT_EQ(shower.show({12345.5}, TotalKind::Sum), QStringLiteral("######"));
     EXPECT_EQ(shower.show({1e14, 0.001}, TotalKind::Sum), QStringLiteral("######")) << "also with many digits";

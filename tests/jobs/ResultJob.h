@@ -66,7 +66,9 @@ private:
         for (const Output &output : job.outputs) {
             if (ResultFile *file = results.fileOf(output)) {
                 EXPECT_TRUE(file->finish()) << file->problem().toStdString();
-                files[QFileInfo(output.file).fileName().toStdString()] = std::string(file->bytes());
+                const std::string name = QFileInfo(output.file).fileName().toStdString();
+                files[name] = std::string(file->bytes());
+                warnings[name] = file->warnings();
             }
         }
         return {};
@@ -78,6 +80,7 @@ public:
     QString text; ///< of the report
     kareport::JobNotes notes;
     std::map<std::string, std::string> files;
+    std::map<std::string, QStringList> warnings; ///< of the outputs
 };
 
 } // namespace jobs

@@ -112,6 +112,42 @@ TEST(ResultOutputs, WhatIsDiscardedIsNotMeant)
     EXPECT_EQ(job.bytes("p.csv"), "Number,Northing\n2A,\n\"1, \"\"a\"\"\",12.5\n");
 }
 
+TEST(ResultOutputs, WhatTheStepNamesIsAmongTheColumnsOfTheData)
+{
+    const QByteArray step = R"({"table": "Points", "data": "p", "sort": "Count",
+        "compute": [{"variable": "Northing", "sum": ["Easting", "Easting"]}], "where": [{"of": "Note", "isNot": "x"}]})";
+    const QByteArray outputs =
+        R"("p.csv", "p.jsonl", {"file": "s.csv", "schema": "s.json"}, {"file": "q.csv", "values": "printed"})";
+    ResultJob job;
+    job.run(withOutputs(templateJob(R"("p": {"values": [{"Number": "2", "Easting": 2, "Count": 5},
+        {"Number": "3", "Easting": 1, "Count": 1, "Note": "X"}, {"Number": "1", "Easting": 4, "Count": 3, "Note": "y"}]})",
+                                    step),
+                        outputs));
+    EXPECT_EQ(job.bytes("p.csv"), "Number,Northing,Easting,Note,Count\n1,8,4,y,3\n2,4,2,,5\n");
+    EXPECT_THAT(job.bytes("p.jsonl"), HasSubstr(R"({"Number":"1","Northing":8,"Easting":4,"Note":"y","Count":3})"));
+    EXPECT_THAT(job.bytes("s.json"), HasSubstr(R"({"name": "Note", "label": "Note", "type": "TEXT", "shown": false})"));
+    EXPECT_EQ(job.bytes("q.csv"), "Number,Northing\n1,8.000\n2,4.000\n") << "what is printed is what is shown";
+    const QString text = job.text;
+    const std::string rows = job.bytes("p.csv");
+    job.folder.put("in.csv", QByteArray::fromStdString(rows));
+    job.run(withOutputs(templateJob(R"("p": {"csv": "in.csv"})", step), R"("p.csv")"));
+    EXPECT_EQ(job.text.toStdString(), text.toStdString()) << "read again, it is the same report";
+    EXPECT_EQ(job.bytes("p.csv"), rows);
+}
+
+TEST(ResultOutputs, ATextThatIsAFormulaElsewhereIsSaid)
+{
+    ResultJob job;
+    job.run(withOutputs(
+        templateJob(R"("p": {"values": [{"Number": "=1+1"}, {"Number": "@x"}, {"Number": "1=1"}]})", oneTable),
+        R"("p.csv", "p.jsonl")"));
+    EXPECT_THAT(job.bytes("p.csv"), HasSubstr("=1+1,")) << "it is written as it is";
+    EXPECT_EQ(
+        job.warnings.at("p.csv").join(u'|'),
+        QStringLiteral("2 texts begin with = or @: a spreadsheet program that opens the file takes them for formulas"));
+    EXPECT_TRUE(job.warnings.at("p.jsonl").isEmpty());
+}
+
 TEST(ResultOutputs, ASchemaSaysWhatTheColumnsAre)
 {
     ResultJob job;

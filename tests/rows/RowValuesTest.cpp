@@ -5,6 +5,7 @@
 
 #include <gtest/gtest.h>
 
+#include <cmath>
 #include <limits>
 #include <numbers>
 #include <optional>
@@ -57,7 +58,16 @@ TEST(RowFormula, ComputesDecimally)
         {Kind::Product, 1, {0, 5}, 0, "nothing"},
         {Kind::Distance, 1, {1, 2, 4, 6}, 5, "in the plane"},
         {Kind::Distance, 1, {1, 2, 3, 3, 5, 9}, 7, "in space"},
+        {Kind::Distance, 1, {5512345.678, 3487654.321, 5512345.677, 3487654.321}, 0.001, "not 0.00099999997764826"},
+        {Kind::Distance, 0.3048, {5512345.678, 3, 5512345.675, 7}, std::hypot(0.003, 4), "in feet"},
+        {Kind::Product, 1, {1e200, 1e200}, infinite, "beyond all numbers, and not 0"},
+        {Kind::Sum, 1, {1e308, 1e308}, infinite, "the same"},
         {Kind::Bearing, 1, {0, 0, 1, 1}, std::numbers::pi / 4, "north-east"},
+        {Kind::Bearing,
+         1,
+         {5512345.678, 3487654.321, 5512345.679, 3487654.322},
+         std::numbers::pi / 4,
+         "a millimetre each"},
         {Kind::Bearing, 1, {0, 0, 0, -1}, std::numbers::pi * 1.5, "west"},
         {Kind::Sum, 1, {1, std::nullopt}, std::nullopt, "an operand is missing"},
         {Kind::Sum, 1, {1, infinite}, infinite, "an operand is infinite"},
@@ -228,15 +238,19 @@ TEST(RunningValue, GoesOnFromRowToRow)
     RunningValue difference = running(Kind::Difference);
     RunningValue number = running(Kind::RowNumber);
     for (int turn = 0; turn < 2; ++turn) {
+        quint64 at = 0;
         for (const Row &row : rows) {
             UDataObject object = rowOf({row.value});
-            sum.setValue(object, row.beginsGroup);
+            sum.setValue(object, row.beginsGroup, ++at);
             EXPECT_EQ(numberAt(object), row.sum);
-            difference.setValue(object, row.beginsGroup);
+            difference.setValue(object, row.beginsGroup, at);
             EXPECT_EQ(numberAt(object), row.difference);
-            number.setValue(object, row.beginsGroup);
+            number.setValue(object, row.beginsGroup, at);
             EXPECT_EQ(numberAt(object), row.number);
         }
+        EXPECT_EQ(sum.leftOut().missing, 1U);
+        EXPECT_EQ(sum.leftOut().firstMissing, 3U) << "also of a group before";
+        EXPECT_EQ(sum.leftOut().notFinite, 1U);
         sum.restart();
         difference.restart();
         number.restart();
@@ -247,8 +261,8 @@ TEST(RunningValue, CountsOverGroupsWhereItIsOfTheTable)
 {
     RunningValue number(RunningValue::Kind::RowNumber, 0, CellReader(), {target, VARIABLE_NUMBER}, false);
     UDataObject object;
-    number.setValue(object, true);
-    number.setValue(object, true);
+    number.setValue(object, true, 1);
+    number.setValue(object, true, 1);
     EXPECT_EQ(std::get<UPointNumber>(object.Find(target)->value()).Convert(), QStringLiteral("2"));
 }
 

@@ -41,6 +41,7 @@ def sheet(book, number, name, codes):
             continue
         if cell.find(main + "f") is not None:
             kind = "f"
+            value = f"{cell.findtext(main + 'f')} = {value}"
         cells.append([cell.get("r"), kind, value, codes[int(cell.get("s", "0"))]])
     pane = root.find(f".//{main}pane")
     filtered = root.find(main + "autoFilter")
