@@ -1903,6 +1903,11 @@
         <translation>die Datenbank wurde beim Lesen verändert, von einem Programm, das nicht SQLite verwendet</translation>
     </message>
     <message>
+        <location filename="../exports/CsvResult.cpp"/>
+        <source>%1 texts begin with = or @: a spreadsheet program that opens the file takes them for formulas</source>
+        <translation>%1 Texte beginnen mit = oder @: ein Tabellenprogramm, das die Datei öffnet, hält sie für Formeln</translation>
+    </message>
+    <message>
         <location filename="../exports/XlsxBook.cpp"/>
         <source>the workbook could not be put together: %1</source>
         <translation>die Arbeitsmappe konnte nicht zusammengestellt werden: %1</translation>
@@ -1911,6 +1916,16 @@
         <location filename="../exports/XlsxResult.cpp"/>
         <source>%1 texts are longer than a cell of a workbook holds, and are cut</source>
         <translation>%1 Texte sind länger als eine Zelle einer Arbeitsmappe fasst und wurden gekürzt</translation>
+    </message>
+    <message>
+        <location filename="../exports/XlsxResult.cpp"/>
+        <source>%1 columns are more than a sheet of a workbook holds, and are left out</source>
+        <translation>%1 Spalten sind mehr, als ein Blatt einer Arbeitsmappe fasst, und fehlen</translation>
+    </message>
+    <message>
+        <location filename="../exports/XlsxResult.cpp"/>
+        <source>%1 totals are values: a formula would show other digits, or does not reach their rows</source>
+        <translation>%1 Summen sind Werte: eine Formel würde andere Ziffern zeigen oder erreicht ihre Zeilen nicht</translation>
     </message>
     <message>
         <location filename="../exports/XlsxResult.cpp"/>
@@ -1951,6 +1966,11 @@
         <location filename="../jobs/ConditionBinding.cpp"/>
         <source>a tolerance from 0 on was expected</source>
         <translation>eine Toleranz ab 0 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ConditionBinding.cpp"/>
+        <source>a number was expected: nothing is above or below NAN</source>
+        <translation>eine Zahl wurde erwartet: nichts liegt über oder unter NAN</translation>
     </message>
     <message>
         <location filename="../jobs/ConditionBinding.cpp"/>
@@ -2199,76 +2219,6 @@
     </message>
     <message>
         <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 value is wider than the field "%2" of the %3 "%4", in row %5, line %6 of the report</source>
-        <translation>%1 Wert ist breiter als das Feld "%2" (%3 "%4"), in Datenzeile %5, Zeile %6 des Berichts</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values are wider than the field "%2" of the %3 "%4", the first one in row %5, line %6 of the report</source>
-        <translation>%1 Werte sind breiter als das Feld "%2" (%3 "%4"), der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 value is wider than the field "%2" of the %3 "%4" and shows as #, in row %5, line %6 of the report</source>
-        <translation>%1 Wert ist breiter als das Feld "%2" (%3 "%4") und erscheint als #, in Datenzeile %5, Zeile %6 des Berichts</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values are wider than the field "%2" of the %3 "%4" and show as #, the first one in row %5, line %6 of the report</source>
-        <translation>%1 Werte sind breiter als das Feld "%2" (%3 "%4") und erscheinen als #, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 value of the field "%2" of the %3 "%4" is infinite or not a number, in row %5, line %6 of the report</source>
-        <translation>%1 Wert des Felds "%2" (%3 "%4") ist unendlich oder keine Zahl, in Datenzeile %5, Zeile %6 des Berichts</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values of the field "%2" of the %3 "%4" are infinite or not a number, the first one in row %5, line %6 of the report</source>
-        <translation>%1 Werte des Felds "%2" (%3 "%4") sind unendlich oder keine Zahl, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 value of the field "%2" of the %3 "%4" is missing and shows as 0, in row %5, line %6 of the report</source>
-        <translation>%1 Wert des Felds "%2" (%3 "%4") fehlt und erscheint als 0, in Datenzeile %5, Zeile %6 des Berichts</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as 0, the first one in row %5, line %6 of the report</source>
-        <translation>%1 Werte des Felds "%2" (%3 "%4") fehlen und erscheinen als 0, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 value of the field "%2" of the %3 "%4" is missing and shows as blanks, in row %5, line %6 of the report</source>
-        <translation>%1 Wert des Felds "%2" (%3 "%4") fehlt und erscheint als Leerzeichen, in Datenzeile %5, Zeile %6 des Berichts</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as blanks, the first one in row %5, line %6 of the report</source>
-        <translation>%1 Werte des Felds "%2" (%3 "%4") fehlen und erscheinen als Leerzeichen, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 value of the variable "%2" is missing and in no total of the table "%3", in row %4</source>
-        <translation>%1 Wert der Variablen „%2“ fehlt und ist in keiner Summe der Tabelle „%3“, in Zeile %4</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values of the variable "%2" are missing and in no total of the table "%3", the first one in row %4</source>
-        <translation>%1 Werte der Variablen „%2“ fehlen und sind in keiner Summe der Tabelle „%3“, der erste in Zeile %4</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 value of the variable "%2" is infinite or not a number and in no total of the table "%3", in row %4</source>
-        <translation>%1 Wert der Variablen „%2“ ist unendlich oder keine Zahl und in keiner Summe der Tabelle „%3“, in Zeile %4</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values of the variable "%2" are infinite or not a number and in no total of the table "%3", the first one in row %4</source>
-        <translation>%1 Werte der Variablen „%2“ sind unendlich oder keine Zahl und in keiner Summe der Tabelle „%3“, der erste in Zeile %4</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
         <source>the data "%1" does not say the unit of its numbers: %2 was taken</source>
         <translation>die Daten „%1“ sagen die Einheit ihrer Zahlen nicht: %2 wurde angenommen</translation>
     </message>
@@ -2296,11 +2246,6 @@
         <location filename="../jobs/JobSteps.cpp"/>
         <source>block</source>
         <translation>Block</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobSteps.cpp"/>
-        <source>table</source>
-        <translation>Tabelle</translation>
     </message>
     <message>
         <location filename="../jobs/JobSteps.cpp"/>
@@ -2346,6 +2291,121 @@
         <location filename="../jobs/JobStepsReader.cpp"/>
         <source>the key "report" with a list of steps was expected</source>
         <translation>der Schlüssel "report" mit einer Liste von Schritten wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobTableStep.cpp"/>
+        <source>table</source>
+        <translation>Tabelle</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 value is wider than the field "%2" of the %3 "%4", in row %5, line %6 of the report</source>
+        <translation>%1 Wert ist breiter als das Feld "%2" (%3 "%4"), in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 values are wider than the field "%2" of the %3 "%4", the first one in row %5, line %6 of the report</source>
+        <translation>%1 Werte sind breiter als das Feld "%2" (%3 "%4"), der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 value is wider than the field "%2" of the %3 "%4" and shows as #, in row %5, line %6 of the report</source>
+        <translation>%1 Wert ist breiter als das Feld "%2" (%3 "%4") und erscheint als #, in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 values are wider than the field "%2" of the %3 "%4" and show as #, the first one in row %5, line %6 of the report</source>
+        <translation>%1 Werte sind breiter als das Feld "%2" (%3 "%4") und erscheinen als #, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 total is wider than the field "%2" of the %3 "%4", under row %5, line %6 of the report</source>
+        <translation>%1 Summe ist breiter als das Feld "%2" (%3 "%4"), unter Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 totals are wider than the field "%2" of the %3 "%4", the first one under row %5, line %6 of the report</source>
+        <translation>%1 Summen sind breiter als das Feld "%2" (%3 "%4"), die erste unter Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 total is wider than the field "%2" of the %3 "%4" and shows as #, under row %5, line %6 of the report</source>
+        <translation>%1 Summe ist breiter als das Feld "%2" (%3 "%4") und erscheint als #, unter Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 totals are wider than the field "%2" of the %3 "%4" and show as #, the first one under row %5, line %6 of the report</source>
+        <translation>%1 Summen sind breiter als das Feld "%2" (%3 "%4") und erscheinen als #, die erste unter Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 value of the field "%2" of the %3 "%4" is infinite or not a number, in row %5, line %6 of the report</source>
+        <translation>%1 Wert des Felds "%2" (%3 "%4") ist unendlich oder keine Zahl, in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 values of the field "%2" of the %3 "%4" are infinite or not a number, the first one in row %5, line %6 of the report</source>
+        <translation>%1 Werte des Felds "%2" (%3 "%4") sind unendlich oder keine Zahl, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 value of the field "%2" of the %3 "%4" is missing and shows as 0, in row %5, line %6 of the report</source>
+        <translation>%1 Wert des Felds "%2" (%3 "%4") fehlt und erscheint als 0, in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as 0, the first one in row %5, line %6 of the report</source>
+        <translation>%1 Werte des Felds "%2" (%3 "%4") fehlen und erscheinen als 0, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 value of the field "%2" of the %3 "%4" is missing and shows as blanks, in row %5, line %6 of the report</source>
+        <translation>%1 Wert des Felds "%2" (%3 "%4") fehlt und erscheint als Leerzeichen, in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as blanks, the first one in row %5, line %6 of the report</source>
+        <translation>%1 Werte des Felds "%2" (%3 "%4") fehlen und erscheinen als Leerzeichen, der erste in Datenzeile %5, Zeile %6 des Berichts</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 value of the variable "%2" is missing and in no total of the table "%3", in row %4</source>
+        <translation>%1 Wert der Variablen „%2“ fehlt und ist in keiner Summe der Tabelle „%3“, in Zeile %4</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 values of the variable "%2" are missing and in no total of the table "%3", the first one in row %4</source>
+        <translation>%1 Werte der Variablen „%2“ fehlen und sind in keiner Summe der Tabelle „%3“, der erste in Zeile %4</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 value of the variable "%2" is infinite or not a number and in no total of the table "%3", in row %4</source>
+        <translation>%1 Wert der Variablen „%2“ ist unendlich oder keine Zahl und in keiner Summe der Tabelle „%3“, in Zeile %4</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 values of the variable "%2" are infinite or not a number and in no total of the table "%3", the first one in row %4</source>
+        <translation>%1 Werte der Variablen „%2“ sind unendlich oder keine Zahl und in keiner Summe der Tabelle „%3“, der erste in Zeile %4</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 value of the variable "%2" is missing and in no running sum of the table "%3", in row %4</source>
+        <translation>%1 Wert der Variablen "%2" fehlt und ist in keiner laufenden Summe der Tabelle "%3", in Datenzeile %4</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 values of the variable "%2" are missing and in no running sum of the table "%3", the first one in row %4</source>
+        <translation>%1 Werte der Variablen "%2" fehlen und sind in keiner laufenden Summe der Tabelle "%3", der erste in Datenzeile %4</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 value of the variable "%2" is infinite or not a number and in no running sum of the table "%3", in row %4</source>
+        <translation>%1 Wert der Variablen "%2" ist unendlich oder keine Zahl und in keiner laufenden Summe der Tabelle "%3", in Datenzeile %4</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 values of the variable "%2" are infinite or not a number and in no running sum of the table "%3", the first one in row %4</source>
+        <translation>%1 Werte der Variablen "%2" sind unendlich oder keine Zahlen und in keiner laufenden Summe der Tabelle "%3", der erste in Datenzeile %4</translation>
     </message>
     <message>
         <location filename="../jobs/JsonNode.cpp"/>
@@ -2626,6 +2686,11 @@
         <location filename="../jobs/VariableLookup.cpp"/>
         <source>the dictionary "%1" has no variable "%2": %3</source>
         <translation>das Wörterbuch „%1“ hat keine Variable „%2“: %3</translation>
+    </message>
+    <message>
+        <location filename="../jobs/VariableLookup.cpp"/>
+        <source>the step sets "%1" only after this: a variable of the data, or one that is set before, was expected</source>
+        <translation>der Schritt setzt "%1" erst danach: eine Variable der Daten oder eine zuvor gesetzte wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/VariableLookup.cpp"/>
@@ -3449,6 +3514,11 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>It gets reports as plain text.</source>
         <translation>Es erhält Berichte als reinen Text.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobExport.cpp"/>
+        <source>"%1" is there already, and is no page of "%2": another name was expected</source>
+        <translation>"%1" ist schon vorhanden und keine Seite von "%2": ein anderer Name wurde erwartet</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobExport.cpp"/>

@@ -1903,6 +1903,11 @@
         <translation>読み取り中に、SQLite を使わないプログラムによってデータベースが変更されました</translation>
     </message>
     <message>
+        <location filename="../exports/CsvResult.cpp"/>
+        <source>%1 texts begin with = or @: a spreadsheet program that opens the file takes them for formulas</source>
+        <translation>%1 個のテキストが = または @ で始まります。ファイルを開く表計算プログラムはこれを数式とみなします</translation>
+    </message>
+    <message>
         <location filename="../exports/XlsxBook.cpp"/>
         <source>the workbook could not be put together: %1</source>
         <translation>ブックを組み立てられませんでした: %1</translation>
@@ -1911,6 +1916,16 @@
         <location filename="../exports/XlsxResult.cpp"/>
         <source>%1 texts are longer than a cell of a workbook holds, and are cut</source>
         <translation>%1 個のテキストはブックのセルに収まらないため、切り詰められました</translation>
+    </message>
+    <message>
+        <location filename="../exports/XlsxResult.cpp"/>
+        <source>%1 columns are more than a sheet of a workbook holds, and are left out</source>
+        <translation>ブックのシートに入らない %1 列は省かれます</translation>
+    </message>
+    <message>
+        <location filename="../exports/XlsxResult.cpp"/>
+        <source>%1 totals are values: a formula would show other digits, or does not reach their rows</source>
+        <translation>%1 個の合計は値です。数式では別の数字になるか、その行に届きません</translation>
     </message>
     <message>
         <location filename="../exports/XlsxResult.cpp"/>
@@ -1951,6 +1966,11 @@
         <location filename="../jobs/ConditionBinding.cpp"/>
         <source>a tolerance from 0 on was expected</source>
         <translation>0 以上の許容差が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/ConditionBinding.cpp"/>
+        <source>a number was expected: nothing is above or below NAN</source>
+        <translation>数値が必要です。NAN より上や下のものはありません</translation>
     </message>
     <message>
         <location filename="../jobs/ConditionBinding.cpp"/>
@@ -2199,76 +2219,6 @@
     </message>
     <message>
         <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 value is wider than the field "%2" of the %3 "%4", in row %5, line %6 of the report</source>
-        <translation>%3 "%4" のフィールド "%2" より幅の広い値が %1 個あります。データの %5 行目、レポートの %6 行目です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values are wider than the field "%2" of the %3 "%4", the first one in row %5, line %6 of the report</source>
-        <translation>%3 "%4" のフィールド "%2" より幅の広い値が %1 個あります。最初はデータの %5 行目、レポートの %6 行目です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 value is wider than the field "%2" of the %3 "%4" and shows as #, in row %5, line %6 of the report</source>
-        <translation>%3 "%4" のフィールド "%2" より幅の広い値が %1 個あり、# で表示されます。データの %5 行目、レポートの %6 行目です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values are wider than the field "%2" of the %3 "%4" and show as #, the first one in row %5, line %6 of the report</source>
-        <translation>%3 "%4" のフィールド "%2" より幅の広い値が %1 個あり、# で表示されます。最初はデータの %5 行目、レポートの %6 行目です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 value of the field "%2" of the %3 "%4" is infinite or not a number, in row %5, line %6 of the report</source>
-        <translation>%3 "%4" のフィールド "%2" の値 %1 個が無限大または非数です。データの %5 行目、レポートの %6 行目です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values of the field "%2" of the %3 "%4" are infinite or not a number, the first one in row %5, line %6 of the report</source>
-        <translation>%3 "%4" のフィールド "%2" の値 %1 個が無限大または非数です。最初はデータの %5 行目、レポートの %6 行目です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 value of the field "%2" of the %3 "%4" is missing and shows as 0, in row %5, line %6 of the report</source>
-        <translation>%3 "%4" のフィールド "%2" の値が %1 個なく、0 と表示されます。データの %5 行目、レポートの %6 行目です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as 0, the first one in row %5, line %6 of the report</source>
-        <translation>%3 "%4" のフィールド "%2" の値が %1 個なく、0 と表示されます。最初はデータの %5 行目、レポートの %6 行目です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 value of the field "%2" of the %3 "%4" is missing and shows as blanks, in row %5, line %6 of the report</source>
-        <translation>%3 "%4" のフィールド "%2" の値が %1 個なく、空白で表示されます。データの %5 行目、レポートの %6 行目です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as blanks, the first one in row %5, line %6 of the report</source>
-        <translation>%3 "%4" のフィールド "%2" の値が %1 個なく、空白で表示されます。最初はデータの %5 行目、レポートの %6 行目です</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 value of the variable "%2" is missing and in no total of the table "%3", in row %4</source>
-        <translation>変数「%2」の値が %1 個なく、表「%3」の合計に含まれていません (%4 行目)</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values of the variable "%2" are missing and in no total of the table "%3", the first one in row %4</source>
-        <translation>変数「%2」の値が %1 個なく、表「%3」の合計に含まれていません (最初は %4 行目)</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 value of the variable "%2" is infinite or not a number and in no total of the table "%3", in row %4</source>
-        <translation>変数「%2」の値が %1 個、無限大または数値でなく、表「%3」の合計に含まれていません (%4 行目)</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
-        <source>%1 values of the variable "%2" are infinite or not a number and in no total of the table "%3", the first one in row %4</source>
-        <translation>変数「%2」の値が %1 個、無限大または数値でなく、表「%3」の合計に含まれていません (最初は %4 行目)</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobStepNotes.cpp"/>
         <source>the data "%1" does not say the unit of its numbers: %2 was taken</source>
         <translation>データ「%1」は数値の単位を示していません: %2 とみなしました</translation>
     </message>
@@ -2296,11 +2246,6 @@
         <location filename="../jobs/JobSteps.cpp"/>
         <source>block</source>
         <translation>ブロック</translation>
-    </message>
-    <message>
-        <location filename="../jobs/JobSteps.cpp"/>
-        <source>table</source>
-        <translation>表</translation>
     </message>
     <message>
         <location filename="../jobs/JobSteps.cpp"/>
@@ -2346,6 +2291,121 @@
         <location filename="../jobs/JobStepsReader.cpp"/>
         <source>the key "report" with a list of steps was expected</source>
         <translation>ステップのリストを値とするキー "report" が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobTableStep.cpp"/>
+        <source>table</source>
+        <translation>表</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 value is wider than the field "%2" of the %3 "%4", in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" より幅の広い値が %1 個あります。データの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 values are wider than the field "%2" of the %3 "%4", the first one in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" より幅の広い値が %1 個あります。最初はデータの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 value is wider than the field "%2" of the %3 "%4" and shows as #, in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" より幅の広い値が %1 個あり、# で表示されます。データの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 values are wider than the field "%2" of the %3 "%4" and show as #, the first one in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" より幅の広い値が %1 個あり、# で表示されます。最初はデータの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 total is wider than the field "%2" of the %3 "%4", under row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" より幅の広い合計が %1 個あります。データの %5 行目の下、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 totals are wider than the field "%2" of the %3 "%4", the first one under row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" より幅の広い合計が %1 個あります。最初はデータの %5 行目の下、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 total is wider than the field "%2" of the %3 "%4" and shows as #, under row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" より幅の広い合計が %1 個あり、# で表示されます。データの %5 行目の下、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 totals are wider than the field "%2" of the %3 "%4" and show as #, the first one under row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" より幅の広い合計が %1 個あり、# で表示されます。最初はデータの %5 行目の下、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 value of the field "%2" of the %3 "%4" is infinite or not a number, in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" の値 %1 個が無限大または非数です。データの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 values of the field "%2" of the %3 "%4" are infinite or not a number, the first one in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" の値 %1 個が無限大または非数です。最初はデータの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 value of the field "%2" of the %3 "%4" is missing and shows as 0, in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" の値が %1 個なく、0 と表示されます。データの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as 0, the first one in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" の値が %1 個なく、0 と表示されます。最初はデータの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 value of the field "%2" of the %3 "%4" is missing and shows as blanks, in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" の値が %1 個なく、空白で表示されます。データの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 values of the field "%2" of the %3 "%4" are missing and show as blanks, the first one in row %5, line %6 of the report</source>
+        <translation>%3 "%4" のフィールド "%2" の値が %1 個なく、空白で表示されます。最初はデータの %5 行目、レポートの %6 行目です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 value of the variable "%2" is missing and in no total of the table "%3", in row %4</source>
+        <translation>変数「%2」の値が %1 個なく、表「%3」の合計に含まれていません (%4 行目)</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 values of the variable "%2" are missing and in no total of the table "%3", the first one in row %4</source>
+        <translation>変数「%2」の値が %1 個なく、表「%3」の合計に含まれていません (最初は %4 行目)</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 value of the variable "%2" is infinite or not a number and in no total of the table "%3", in row %4</source>
+        <translation>変数「%2」の値が %1 個、無限大または数値でなく、表「%3」の合計に含まれていません (%4 行目)</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 values of the variable "%2" are infinite or not a number and in no total of the table "%3", the first one in row %4</source>
+        <translation>変数「%2」の値が %1 個、無限大または数値でなく、表「%3」の合計に含まれていません (最初は %4 行目)</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 value of the variable "%2" is missing and in no running sum of the table "%3", in row %4</source>
+        <translation>変数「%2」の値が %1 個なく、表「%3」の累計に含まれていません (%4 行目)</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 values of the variable "%2" are missing and in no running sum of the table "%3", the first one in row %4</source>
+        <translation>変数「%2」の値が %1 個なく、表「%3」の累計に含まれていません (最初は %4 行目)</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 value of the variable "%2" is infinite or not a number and in no running sum of the table "%3", in row %4</source>
+        <translation>変数「%2」の値が %1 個、無限大または数値でなく、表「%3」の累計に含まれていません (%4 行目)</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>%1 values of the variable "%2" are infinite or not a number and in no running sum of the table "%3", the first one in row %4</source>
+        <translation>変数「%2」の値が %1 個、無限大または数値でなく、表「%3」の累計に含まれていません (最初は %4 行目)</translation>
     </message>
     <message>
         <location filename="../jobs/JsonNode.cpp"/>
@@ -2626,6 +2686,11 @@
         <location filename="../jobs/VariableLookup.cpp"/>
         <source>the dictionary "%1" has no variable "%2": %3</source>
         <translation>辞書「%1」に変数「%2」がありません: %3</translation>
+    </message>
+    <message>
+        <location filename="../jobs/VariableLookup.cpp"/>
+        <source>the step sets "%1" only after this: a variable of the data, or one that is set before, was expected</source>
+        <translation>このステップは「%1」をこの後で設定します。データの変数か、先に設定される変数が必要です</translation>
     </message>
     <message>
         <location filename="../jobs/VariableLookup.cpp"/>
@@ -3449,6 +3514,11 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/EditorPage.cpp"/>
         <source>It gets reports as plain text.</source>
         <translation>帳票はプレーンテキストで渡されます。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/JobExport.cpp"/>
+        <source>"%1" is there already, and is no page of "%2": another name was expected</source>
+        <translation>「%1」はすでにあり、「%2」のページではありません。別の名前が必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobExport.cpp"/>
