@@ -74,7 +74,7 @@ private:
 
     Wrong noSuchRecord(const QString &what, const QString &name, const QStringList &names, const JsonPath &path) const;
     /// The first of two errors.
-    static Wrong firstOf(Wrong first, Wrong second) { return first ? std::move(first) : std::move(second); }
+    static Wrong firstOf(const Wrong &first, const Wrong &second) { return first ? first : second; }
     Wrong wrongRecord(const WrittenRecord &record) const;
     static void expectMemory(bool isWritten);
     /// @param shown  the fields that show what is read; null where more is made of it

@@ -183,7 +183,7 @@ void ResultOutputs::addHiddenColumns(ResultTable &table)
         if (column && !isColumn) {
             hidden_.push_back(static_cast<unsigned>(column->field.ID));
             describeColumn(*column, *data_.dictionary, data_.units);
-            table.columns.push_back(*std::move(column));
+            table.columns.push_back(*column);
         }
     }
 }

@@ -52,7 +52,7 @@ std::optional<FoundVariable> VariableLookup::known(const QString &name) const
 
 FoundVariable VariableLookup::find(const TableShape::Name &name)
 {
-    auto found = known(name.text);
+    const auto found = known(name.text);
     if (!found) {
         const sXmlReportTable &table = surroundings_.table;
         const QStringList names = variableNames(*surroundings_.reportTemplate.GetDictionary(table.Use));
@@ -65,7 +65,7 @@ FoundVariable VariableLookup::find(const TableShape::Name &name)
     if (isNew) {
         found_.push_back(*found);
     }
-    return *std::move(found);
+    return *found;
 }
 
 void VariableLookup::addSet(const QString &variable, int stage)
