@@ -1,7 +1,7 @@
 #!/usr/bin/env bash
 # Installs the Debian packages that a task needs and that are not there yet.
 #
-#   scripts/packages.sh build|test|docs|package|office|bench|compare|tidy|coverage|tables [...]
+#   scripts/packages.sh build|test|docs|package|office|bench|compare|windows|tidy|coverage|tables [...]
 #
 # Every package is listed once, with the reason for it. apt is not called when all are installed.
 set -euo pipefail
@@ -73,6 +73,22 @@ packages_compare=(
     featherpad              # a text editor
     xvfb python3-xlib       # a screen that is watched
     parallel                # a batch over processes
+)
+packages_windows=(
+    g++-mingw-w64-x86-64-posix # the compiler, with C++'s threads
+    libz-mingw-w64-dev      # zlib, the one library that Debian has for Windows
+    dpkg-dev                # unpacks and checks source packages
+    qt6-base-dev            # the tools that Qt's build and ours run here
+    qt6-base-dev-tools      # likewise
+    meson ninja-build cmake # builds of the libraries
+    pkg-config gperf python3 # what fontconfig's build runs
+    make gcc tcl            # what SQLite's and PostgreSQL's builds run
+    perl                    # likewise, and Qt's build runs it
+    qt6-translations-l10n   # Qt's own texts in other languages
+    fonts-dejavu-core       # the fixed-pitch face
+    zip                     # what users unpack
+    wine64                  # runs the programs
+    xvfb xauth              # a screen for their windows
 )
 packages_tidy=(
     clang clang-tidy        # the sources read for mistakes that compile
