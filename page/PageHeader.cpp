@@ -19,12 +19,17 @@ namespace
 /// The text before the page number, without blanks, in every language and in the current one.
 QStringList pageLabels()
 {
-    constexpr const char *label = "   Page:@@Report Header";
-    static const QStringList known = inAllLanguages(label);
+    constexpr const char *english = "   Page:@@Report Header";
+    static const QStringList known = inAllLanguages(english);
     QStringList labels;
-    for (const QString &text : known + QStringList(Xlate(label))) {
-        if (const QString trimmed = text.trimmed(); !trimmed.isEmpty() && !labels.contains(trimmed)) {
-            labels.append(trimmed);
+    for (const QString &text : known + QStringList(Xlate(english))) {
+        const QString trimmed = text.trimmed();
+        // A report that is loaded has a character for each byte of its file.
+        const QString bytes = QString::fromLatin1(trimmed.toUtf8());
+        for (const QString *label : {&trimmed, &bytes}) {
+            if (!label->isEmpty() && !labels.contains(*label)) {
+                labels.append(*label);
+            }
         }
     }
     return labels;

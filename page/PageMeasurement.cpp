@@ -54,12 +54,16 @@ void setSheet(QPrinter &printer, const QSize &sheet)
     }
 }
 
-PageDevice installedDevice(const QPrinterInfo &info, const QSize &sheet, bool portrait)
+/// @return nothing when the printer cannot be opened
+std::optional<PageDevice> installedDevice(const QPrinterInfo &info, const QSize &sheet, bool portrait)
 {
     QPrinter printer(info, QPrinter::HighResolution);
+    if (!printer.isValid()) {
+        return std::nullopt;
+    }
     setSheet(printer, sheet);
     printer.setPageOrientation(portrait ? QPageLayout::Portrait : QPageLayout::Landscape);
-    return {printer.pageLayout().fullRectPixels(printer.resolution()).size(), printer.resolution()};
+    return PageDevice{printer.pageLayout().fullRectPixels(printer.resolution()).size(), printer.resolution()};
 }
 
 QPrinterInfo installedPrinter(const DefaultPrinter &printer)

@@ -61,7 +61,9 @@ void kareport::noteExitCancelled()
     while (!deferredReports().empty()) {
         const DeferredReport deferred = deferredReports().back();
         deferredReports().pop_back();
-        if (deferred.isAskedToClose) {
+        if (deferred.isAskedToClose && deferred.closeMode == 1) {
+            deferred.report->SetCloseDocument(2); // the host defers it as well: it is the next request that closes
+        } else if (deferred.isAskedToClose) {
             deferred.report->CloseReportDocument();
         } else {
             deferred.report->SetCloseDocument(deferred.closeMode);

@@ -23,7 +23,7 @@ bool isPdfName(QStringView name);
 /// @param richTextFirst  offers rich text before report text
 /// @return nothing when the user has cancelled
 std::optional<QString> askReportName(UDocument &document, bool richTextFirst);
-/// Says that a report could not be saved, and why. @param reason  empty when it is not known: what to do is said then
+/// Says in a message that a report could not be saved, and why, for a host that wants it. @param reason  empty when it is not known: what to do is said then
 void sayNotSaved(const QString &path, const QString &reason = QString());
 
 } // namespace kareport

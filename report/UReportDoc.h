@@ -288,9 +288,9 @@ public:
     /// The window style of a pane that a report opens for itself.
     static constexpr unsigned ownPaneStyle = 4096;
 
-    /// The report's title as it was given, to be changed in place: neither header line nor panes follow.
+    /// The report's title, with the number that made it unique, to be changed in place: neither header line nor panes follow.
     QString &GetTitle();
-    /// The report's title as it was given, without the number that its panes may show.
+    /// The report's title, with the number that made it unique; without the number of a window that a pane may show.
     const QString &GetTitle() const;
     /// Sets the title and the header line. While an open pane of another document has the title as its caption, the
     /// document's title gets a number from 2 after it; the header line keeps the title as given. An empty title gets none.

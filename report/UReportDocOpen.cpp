@@ -156,6 +156,7 @@ int UReportDoc::LoadFile(const QString &path, bool keepLineEnds)
     }
     if (isDocument) {
         // What the opening answers counts for nothing: a document that was too large was said to be.
+        parts_->openedWithoutMemory = false; // an earlier opening's, where a derived class opens by itself
         const bool isOpened = OnOpenDocument(path);
         return !isOpened && IsReportAvailable(this) && parts_->openedWithoutMemory ? 0 : 1;
     }

@@ -11,6 +11,7 @@
 #include "ReportSaveName.h"
 #include "ReportTextCodec.h"
 #include "ReportViews.h"
+#include "SaveDialog.h"
 #include "StandardText.h"
 #include "UView.h"
 #include "WaitCursor.h"
@@ -114,7 +115,7 @@ bool saveUnderChosenName(UReportDoc &report, const QString &path, bool replace)
     // A notification of the save, or a view that was updated, may have closed the report.
     const bool isThere = UReportDoc::IsReportAvailable(&report);
     if (!isSaved) {
-        kareport::sayNotSaved(name, isThere ? report.GetSaveProblem() : QString());
+        kareport::saySaveFailed(name, isThere ? report.GetSaveProblem() : QString());
         return false;
     }
     if (isThere) {
@@ -124,7 +125,7 @@ bool saveUnderChosenName(UReportDoc &report, const QString &path, bool replace)
         if (replace && report.GetPathName() != name) {
             // There was no memory for it: what is saved later would go to another file.
             report.SetModifiedFlag(wasModified);
-            kareport::sayNotSaved(name, kareport::noMemoryText());
+            kareport::saySaveFailed(name, kareport::noMemoryText());
             return false;
         }
         report.SetModifiedFlag(false);
@@ -136,6 +137,7 @@ bool saveUnderChosenName(UReportDoc &report, const QString &path, bool replace)
 
 bool UReportDoc::DoSave(const QString &path, bool replace)
 {
+    parts_->saveProblem.clear(); // a host's own OnSaveDocument leaves none
     return kareport::whileMemoryLasts(false, [&] { return saveUnderChosenName(*this, path, replace); });
 }
 

@@ -7,6 +7,7 @@
 #include "ReportEntry.h"
 #include "ReportGuards.h"
 #include "ReportSaveName.h"
+#include "SaveDialog.h"
 #include "ReportViews.h"
 #include "UDocTemplate.h"
 #include "UReportDoc.h"
@@ -62,7 +63,7 @@ void UReportWindowDlg::OnSave()
     const bool isSaved = report->OnSaveDocument(*path);
     const bool isOpen = UReportDoc::IsReportAvailable(report);
     if (!isSaved) {
-        kareport::sayNotSaved(*path, isOpen ? report->GetSaveProblem() : QString());
+        kareport::saySaveFailed(*path, isOpen ? report->GetSaveProblem() : QString());
     } else if (isOpen) {
         report->SetModifiedFlag(false);
     }

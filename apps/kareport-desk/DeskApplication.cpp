@@ -10,7 +10,9 @@
 #include "PrintDialogs.h"
 #include "Profile.h"
 #include "ReportEntry.h"
+#include "ReportSaveName.h"
 #include "SaveAs.h"
+#include "SaveDialog.h"
 #include "WorkAside.h"
 
 #include <QFileInfo>
@@ -80,6 +82,7 @@ void installDialogs(QWidget *parent)
     setSaveDialog([parent](const SaveRequest &request) {
         return askOwnName(request, [parent](const SaveRequest &asked) { return askSavePath(parent, asked); });
     });
+    setSaveFailure(sayNotSaved);
 }
 
 } // namespace kareport

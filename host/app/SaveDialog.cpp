@@ -12,6 +12,12 @@ SaveDialog &installedDialog()
     return dialog;
 }
 
+SaveFailure &installedFailure()
+{
+    static SaveFailure say;
+    return say;
+}
+
 } // namespace
 
 void setSaveDialog(SaveDialog dialog)
@@ -22,6 +28,18 @@ void setSaveDialog(SaveDialog dialog)
 std::optional<QString> askSaveName(const SaveRequest &request)
 {
     return installedDialog() ? installedDialog()(request) : std::nullopt;
+}
+
+void setSaveFailure(SaveFailure say)
+{
+    installedFailure() = std::move(say);
+}
+
+void saySaveFailed(const QString &path, const QString &reason)
+{
+    if (installedFailure()) {
+        installedFailure()(path, reason);
+    }
 }
 
 } // namespace kareport

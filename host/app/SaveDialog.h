@@ -31,9 +31,17 @@ struct SaveRequest
 /// Shows the dialog. @return the full path that was chosen, or nothing when it was cancelled
 using SaveDialog = std::function<std::optional<QString>(const SaveRequest &request)>;
 
+/// Says that a document could not be saved. @param reason  why, without a full stop; empty when it is not known
+using SaveFailure = std::function<void(const QString &path, const QString &reason)>;
+
 /// Installs what asks for names; an empty one cancels every question again.
 KAREPORT_EXPORT void setSaveDialog(SaveDialog dialog);
 /// Asks for a name through what is installed.
 KAREPORT_EXPORT std::optional<QString> askSaveName(const SaveRequest &request);
+/// Installs what says that a save under a name that was asked for has failed. Without it nothing is said: the document's
+/// answer is all that its host gets.
+KAREPORT_EXPORT void setSaveFailure(SaveFailure say);
+/// Says it through what is installed.
+KAREPORT_EXPORT void saySaveFailed(const QString &path, const QString &reason);
 
 } // namespace kareport

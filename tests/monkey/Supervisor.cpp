@@ -106,7 +106,8 @@ Outcome Supervisor::run(const Steps &steps)
             return outcome;
         }
         if (!isStuck && worker.exitStatus() == QProcess::CrashExit && isDeathAtOnce(worker.exitCode()) &&
-            lines.value(lines.size() - 1).startsWith(u"crash ")) {
+            lines.value(lines.size() - 1).startsWith(u"crash "))
+        {
             from = QString::number(outcome.step); // as it was asked to
             continue;
         }

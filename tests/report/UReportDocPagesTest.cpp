@@ -1,3 +1,4 @@
+#include "FrameFixture.h"
 #include "ReportFixture.h"
 #include "ReportPages.h"
 #include "ReportTextCodec.h"
@@ -250,6 +251,25 @@ TEST_F(UReportDocPages, ALoadedFileHasThePagesThatItWasWrittenIn)
         ASSERT_EQ(loaded.LoadFile(file, keepsLineEnds), 1);
         EXPECT_EQ(loaded.GetPages().size(), 3U) << "line ends kept: " << keepsLineEnds;
         EXPECT_EQ(wordsOf(loaded), QStringLiteral("TALVEN TALVEN TALVEN"));
+    }
+}
+
+TEST_F(UReportDocPages, ALoadedFileIsReadByItsHeadersInAnyLanguage)
+{
+    const QTemporaryDir folder;
+    const QString file = folder.filePath(QStringLiteral("a.rep"));
+    for (const QString &label :
+         {QStringLiteral("   Page:"), QStringLiteral("   Seite:"), QString::fromUtf8("   \xE9\xA0\x81:")})
+    {
+        QString text;
+        for (const int page : {1, 2, 3}) {
+            text += headerOf(QStringLiteral("T"), page).replace(QStringLiteral("   Page:"), label) +
+                    QStringLiteral("\na\nb\n");
+        }
+        putFile(file, ("\xEF\xBB\xBF" + text.toUtf8()).constData());
+        UReportDoc loaded; // a character for each byte
+        ASSERT_EQ(loaded.LoadFile(file, true), 1);
+        EXPECT_EQ(loaded.GetPages().size(), 3U) << label.toStdString();
     }
 }
 

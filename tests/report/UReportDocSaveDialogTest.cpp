@@ -6,6 +6,7 @@
 #include <QCoreApplication>
 #include <QCursor>
 #include <QDir>
+#include <QFileInfo>
 #include <QGuiApplication>
 #include <QTemporaryDir>
 #include <QTranslator>
@@ -288,6 +289,61 @@ TEST(UReportDocSaveDialog, AFailedSaveKeepsNameAndModifiedFlag)
         EXPECT_EQ(report.GetPathName(), QStringLiteral("/jobs/own.rep")) << name.toStdString();
         EXPECT_EQ(application.GetRecentFileList(), QStringList()) << name.toStdString();
     }
+}
+
+TEST(UReportDocSaveDialog, AFailedSaveIsSaidOnlyWhereTheHostHasInstalledIt)
+{
+    const FixedSurroundings surroundings;
+    const UApplication application;
+    const QTemporaryDir folder;
+    const AnsweredMessages messages(MessageAnswer::Yes);
+    for (const bool isInstalled : {false, true}) {
+        QStringList said;
+        if (isInstalled) {
+            kareport::setSaveFailure([&said](const QString &path, const QString &reason) {
+                said.append(QFileInfo(path).fileName() + u' ' + (reason.isEmpty() ? u"unknown" : u"known"));
+            });
+        }
+        UReportDoc report;
+        report.SetAutoDelete(false);
+        ASSERT_TRUE(report.Write(QStringLiteral("text\n"), 0));
+        EXPECT_FALSE(report.DoSave(folder.filePath(QStringLiteral("none/a.rep")), false));
+        WatchedReport watched;
+        watched.succeeds = false;
+        EXPECT_FALSE(watched.DoSave(QStringLiteral("b.rep"), false));
+        kareport::setSaveFailure({});
+        EXPECT_EQ(said, isInstalled ? QStringList({QStringLiteral("a.rep known"), QStringLiteral("b.rep unknown")})
+                                    : QStringList());
+    }
+    EXPECT_TRUE(messages.texts.isEmpty()) << "the module shows none itself";
+}
+
+/// Saves as its base does until the host takes it over.
+class TakenOverReport : public UReportDoc
+{
+public:
+    bool OnSaveDocument(const QString &path) override { return !isTakenOver && UReportDoc::OnSaveDocument(path); }
+
+    bool isTakenOver = false;
+};
+
+TEST(UReportDocSaveDialog, AHostsOwnSaveHasNotTheReasonOfAnEarlierOne)
+{
+    const FixedSurroundings surroundings;
+    const UApplication application;
+    const QTemporaryDir folder;
+    QStringList reasons;
+    kareport::setSaveFailure([&reasons](const QString &, const QString &reason) { reasons.append(reason); });
+    TakenOverReport report;
+    report.SetAutoDelete(false);
+    ASSERT_TRUE(report.Write(QStringLiteral("text\n"), 0));
+    EXPECT_FALSE(report.DoSave(folder.filePath(QStringLiteral("none/a.rep")), false));
+    report.isTakenOver = true;
+    EXPECT_FALSE(report.DoSave(folder.filePath(QStringLiteral("a.rep")), false));
+    kareport::setSaveFailure({});
+    ASSERT_EQ(reasons.size(), 2);
+    EXPECT_FALSE(reasons[0].isEmpty());
+    EXPECT_TRUE(reasons[1].isEmpty()) << reasons[1].toStdString();
 }
 
 TEST(UReportDocSaveDialog, TheWaitCursorIsShownWhileTheFileIsWritten)

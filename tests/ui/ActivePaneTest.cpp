@@ -383,6 +383,20 @@ TEST_F(ActivePane, AnExitThatIsRefusedClosesNoReportLater)
     desk.application.reset();
 }
 
+TEST_F(ActivePane, AReportThatTheHostHasDeferredIsOnlyAskedToCloseDuringAnExitThatIsRefused)
+{
+    UReportDoc *report = CreateReportWindow(QStringLiteral("Written"), false, false);
+    report->SetCloseDocument(1);
+    kareport::deferCloseForExit(*report);
+    report->CloseReportDocument();
+    EXPECT_TRUE(UReportDoc::IsReportAvailable(report));
+    kareport::noteExitCancelled();
+    ASSERT_TRUE(UReportDoc::IsReportAvailable(report)) << "the first request of a deferred report does not close it";
+    EXPECT_EQ(report->GetCloseDocument(), 2);
+    report->CloseReportDocument();
+    EXPECT_FALSE(UReportDoc::IsReportAvailable(report));
+}
+
 TEST_F(ActivePane, AReportThatIsAskedToCloseDuringAnExitThatIsRefusedIsClosedThen)
 {
     desk.frame.reset();
