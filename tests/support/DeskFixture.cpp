@@ -1,5 +1,8 @@
 #include "DeskFixture.h"
 
+#include "ReportSaveName.h"
+#include "SaveDialog.h"
+
 Desk::Desk()
 {
     QStandardPaths::setTestModeEnabled(true);
@@ -8,6 +11,7 @@ Desk::Desk()
         messages.append(message.text);
         return answer;
     });
+    kareport::setSaveFailure(kareport::sayNotSaved);
     application.emplace();
     frame.emplace();
     frame->show();
@@ -19,6 +23,7 @@ Desk::~Desk()
     application.reset();
     QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
     kareport::setMessageBox({});
+    kareport::setSaveFailure({});
     kareport::setProfileStore(kareport::makeMemoryProfile());
 }
 
