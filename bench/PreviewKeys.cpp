@@ -56,7 +56,7 @@ kareport::TemplateWindow *openWindow()
 /// Waits for the pages and has them painted. @return milliseconds
 double painted(kareport::TemplateWindow &window, const QElapsedTimer &timer)
 {
-    while (!window.isUpToDate()) {
+    while (!window.arePagesUpToDate()) {
         QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
     }
     window.page().viewport()->repaint();
@@ -101,7 +101,7 @@ void changeOrder(kareport::TemplateWindow &window)
     timer.start();
     edit.replaceBy(text, {0, 0});
     double said = -1;
-    while (!window.isUpToDate()) {
+    while (!window.arePagesUpToDate()) {
         QCoreApplication::processEvents(QEventLoop::WaitForMoreEvents);
         if (said < 0 && !window.message().isHidden()) {
             window.message().repaint();

@@ -193,7 +193,7 @@ Expected<std::shared_ptr<KeptData>> TemplatePreview::dataFor(const QString &file
 
 std::optional<InputError> TemplatePreview::makePages(const QString &text, const QByteArray &bytes, const QString &name,
                                                      PreviewReport &report, const std::function<bool()> &isStopped,
-                                                     std::optional<PreviewPages> &pages)
+                                                     const TemplateOutline *outline, std::optional<PreviewPages> &pages)
 {
     const QString file = folder_.filePath(QFileInfo(path_).fileName());
     if (auto error = write(bytes, file)) {
@@ -238,22 +238,27 @@ std::optional<InputError> TemplatePreview::makePages(const QString &text, const 
     made.isWhole = isWhole && end == made.text.size();
     made.text.truncate(end);
     std::copy_if(starts.begin(), starts.end(), std::back_inserter(made.starts), [end](qint64 at) { return at < end; });
-    const TemplateOutline outline = outlineOf(text);
-    if (const OutlineTemplate *shown = outline.templateOf(made.templateName)) {
+    const TemplateOutline own = outline == nullptr ? outlineOf(text) : TemplateOutline();
+    if (const OutlineTemplate *shown = (outline != nullptr ? *outline : own).templateOf(made.templateName)) {
         made.cells = cellsOf(written, *shown, end);
     }
     pages = std::move(made);
     return std::nullopt;
 }
 
+std::vector<TemplateRemark> TemplatePreview::remarksOn(const QString &text)
+{
+    const QByteArray plain = QString(text).replace(QChar(u'\0'), QChar::ReplacementCharacter).toUtf8();
+    return checkTemplates(TemplateFile{QByteArrayView(plain)});
+}
+
 PreviewResult TemplatePreview::make(const QString &text, const QByteArray &bytes, const QString &name,
-                                    PreviewReport &report, const std::function<bool()> &isStopped)
+                                    PreviewReport &report, const std::function<bool()> &isStopped,
+                                    const TemplateOutline *outline)
 {
     PreviewResult result;
     try {
-        const QByteArray plain = QString(text).replace(QChar(u'\0'), QChar::ReplacementCharacter).toUtf8();
-        result.remarks = checkTemplates(TemplateFile{QByteArrayView(plain)});
-        result.wrong = makePages(text, bytes, name, report, isStopped, result.pages);
+        result.wrong = makePages(text, bytes, name, report, isStopped, outline, result.pages);
     } catch (const std::bad_alloc &) {
         result.pages.reset();
         result.wrong = InputError{path_, std::nullopt, Xlate("There is not enough memory for this input.")};

@@ -59,9 +59,8 @@ struct PreviewPages
 /// What came of a template's text.
 struct PreviewResult
 {
-    std::vector<TemplateRemark> remarks; ///< of the check, in the order of the text
-    std::optional<PreviewPages> pages;   ///< nothing where they could not be made
-    std::optional<InputError> wrong;     ///< why not; nothing when it was stopped
+    std::optional<PreviewPages> pages; ///< nothing where they could not be made
+    std::optional<InputError> wrong;   ///< why not; nothing when it was stopped
     bool isStopped = false;
 };
 
@@ -94,15 +93,18 @@ public:
     /// @param name    the template that samples are shown of; a job says its own
     /// @param report  a new one
     /// @param isStopped  is asked now and then; its true ends the work
+    /// @param outline    of the text, where it is known already; null to have it made
     PreviewResult make(const QString &text, const QByteArray &bytes, const QString &name, PreviewReport &report,
-                       const std::function<bool()> &isStopped);
+                       const std::function<bool()> &isStopped, const TemplateOutline *outline = nullptr);
+    /// What the check of templates says of a text, in its order.
+    static std::vector<TemplateRemark> remarksOn(const QString &text);
     /// How often data was opened or ordered so far.
     int openings() const { return openings_ + (data_ ? data_->openings() : 0); }
 
 private:
     std::optional<InputError> makePages(const QString &text, const QByteArray &bytes, const QString &name,
                                         PreviewReport &report, const std::function<bool()> &isStopped,
-                                        std::optional<PreviewPages> &pages);
+                                        const TemplateOutline *outline, std::optional<PreviewPages> &pages);
     Expected<std::shared_ptr<KeptData>> dataFor(const QString &file, const QString &name);
     std::optional<InputError> write(const QByteArray &bytes, const QString &file) const;
     InputError withOwnPath(InputError error, const QString &file) const;

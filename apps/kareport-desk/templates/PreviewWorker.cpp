@@ -3,6 +3,7 @@
 #include <QMetaObject>
 
 #include <limits>
+#include <new>
 #include <system_error>
 #include <utility>
 
@@ -45,7 +46,6 @@ void PreviewWorker::show(Request request)
     std::optional<Work> passedOver; // its report is deleted here
     {
         const std::lock_guard lock(mutex_);
-        lastNumber_ = request.number;
         newest_ = request.number;
         work.request = std::move(request);
         if (thread_.joinable()) {
@@ -91,18 +91,38 @@ void PreviewWorker::carryOut(Work work)
         }
         dataFiles_ = preview_.dataFiles();
     }
-    Answer answer;
-    answer.number = work.request.number;
-    answer.result = preview_.make(work.request.text, work.request.bytes, work.request.templateName, *work.report,
-                                  [this, number = work.request.number] { return newest_ > number; });
-    answer.text = std::move(work.request.text);
-    answer.jobTemplate = preview_.jobTemplate();
-    answer.dataProblem = dataProblem_;
-    answer.dataFiles = dataFiles_;
-    answer.report = std::move(work.report);
+    const Request &request = work.request;
+    const auto isStopped = [this, number = request.number] { return newest_ > number; };
+    Answer pages;
+    pages.number = request.number;
+    pages.result = preview_.make(request.text, request.bytes, request.templateName, *work.report, isStopped,
+                                 request.outline.get());
+    pages.text = request.text;
+    pages.jobTemplate = preview_.jobTemplate();
+    pages.dataProblem = dataProblem_;
+    pages.dataFiles = dataFiles_;
+    pages.report = std::move(work.report);
+    answer(std::move(pages));
+    if (isStopped()) {
+        return;
+    }
+    Answer remarks;
+    remarks.number = request.number;
+    remarks.areRemarks = true;
+    try {
+        remarks.remarks = TemplatePreview::remarksOn(request.text);
+    } catch (const std::bad_alloc &) {
+        return; // those before stay
+    }
+    answer(std::move(remarks));
+}
+
+/// Hands an answer to the thread of the windows.
+void PreviewWorker::answer(Answer made)
+{
     {
         const std::lock_guard lock(mutex_);
-        answers_.push_back(std::move(answer));
+        answers_.push_back(std::move(made));
     }
     QMetaObject::invokeMethod(
         &receiver_, [this] { takeAnswers(); }, Qt::QueuedConnection);
@@ -115,9 +135,8 @@ void PreviewWorker::takeAnswers()
         const std::lock_guard lock(mutex_);
         answers = std::exchange(answers_, {});
     }
-    for (Answer &answer : answers) {
-        answeredNumber_ = answer.number;
-        answered_(answer);
+    for (Answer &one : answers) {
+        answered_(one);
     }
 }
 

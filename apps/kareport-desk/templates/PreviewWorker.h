@@ -30,13 +30,16 @@ public:
         quint64 number = 0;
         QString text;
         QByteArray bytes;
-        QString templateName; ///< that samples are shown of
+        QString templateName;                           ///< that samples are shown of
+        std::shared_ptr<const TemplateOutline> outline; ///< of the text
     };
     struct Answer
     {
         quint64 number = 0; ///< of the request
         QString text;
-        PreviewResult result;
+        bool areRemarks = false; ///< they follow the pages, which are waited for more
+        std::vector<TemplateRemark> remarks;
+        PreviewResult result;                  ///< of an answer that has no remarks
         QString jobTemplate;                   ///< that the job shows; empty for samples
         std::optional<InputError> dataProblem; ///< with the data that was to be shown from this answer on
         QStringList dataFiles;                 ///< that the pages depend on
@@ -54,8 +57,6 @@ public:
     void show(Request request);
     /// Sets the data of what is shown next, read anew. A request has to follow.
     void setData(Data data);
-    /// Whether the last request has been answered.
-    bool isIdle() const { return answeredNumber_ == lastNumber_; }
 
 private:
     struct Work
@@ -67,6 +68,7 @@ private:
 
     void run();
     void carryOut(Work work);
+    void answer(Answer made);
     void takeAnswers();
 
     TemplatePreview preview_;
@@ -81,8 +83,6 @@ private:
     std::vector<Answer> answers_;
     std::atomic<quint64> newest_ = 0; ///< work for an earlier request is stopped
     bool isEnding_ = false;
-    quint64 lastNumber_ = 0;
-    quint64 answeredNumber_ = 0;
     std::thread thread_; ///< last: it begins when all else is there
 };
 

@@ -27,6 +27,8 @@ TemplateFindBar::TemplateFindBar(TemplateTextEdit &edit, QWidget *parent)
     setAccessibleName(Xlate("Find and replace"));
     field_->setAccessibleName(Xlate("Text to find"));
     field_->setPlaceholderText(Xlate("Find"));
+    constexpr int leastWidth = 120;
+    field_->setMinimumWidth(leastWidth);
     replacement_->setAccessibleName(Xlate("Text to put in its place"));
     replacement_->setPlaceholderText(Xlate("Replace with"));
     count_->setAccessibleName(Xlate("Matches"));

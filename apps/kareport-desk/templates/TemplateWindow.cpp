@@ -1,6 +1,7 @@
 #include "TemplateWindow.h"
 
 #include "AppMessageBox.h"
+#include "PlainWidgets.h"
 #include "TemplateFindBar.h"
 #include "TemplatePage.h"
 #include "TemplateTextEdit.h"
@@ -88,11 +89,6 @@ TemplateWindow::~TemplateWindow()
     worker_.reset();
 }
 
-bool TemplateWindow::isUpToDate() const
-{
-    return shown_ == requested_;
-}
-
 void TemplateWindow::goTo(qsizetype line, qsizetype column)
 {
     const qsizetype at = positionOf(*edit_->document(), {line, column});
@@ -110,12 +106,12 @@ void TemplateWindow::textChanged()
 void TemplateWindow::requestPages()
 {
     outlined_ = edit_->wholeText();
-    outline_ = outlineOf(outlined_);
-    const OutlineTemplate *here = outline_.templateAt(edit_->textCursor().position());
+    outline_ = std::make_shared<TemplateOutline>(outlineOf(outlined_));
+    const OutlineTemplate *here = outline_->templateAt(edit_->textCursor().position());
     templateName_->setText(here != nullptr ? here->name.text : QString());
     ++requested_;
     workingTimer_.start();
-    worker_->show({requested_, outlined_, file_.bytesOf(outlined_), templateName_->text()});
+    worker_->show({requested_, outlined_, file_.bytesOf(outlined_), templateName_->text(), outline_});
 }
 
 void TemplateWindow::takeAnswer(PreviewWorker::Answer &answer)
@@ -123,9 +119,14 @@ void TemplateWindow::takeAnswer(PreviewWorker::Answer &answer)
     if (answer.number != requested_) {
         return; // a later one is on its way
     }
+    if (answer.areRemarks) {
+        checked_ = answer.number;
+        showRemarks(answer.remarks);
+        showPlace();
+        return;
+    }
     shown_ = answer.number;
     workingTimer_.stop();
-    showRemarks(answer.result.remarks);
     if (answer.result.pages) {
         pagesText_ = std::move(answer.text);
         page_->setPages(*std::move(answer.result.pages));
@@ -163,7 +164,9 @@ void TemplateWindow::showRemarks(const std::vector<TemplateRemark> &remarks)
         cells.append(QString::number(remark.place.line));
         cells.append(remark.isError ? Xlate("error") : Xlate("warning"));
         cells.append(remark.text);
-        items.append(new QTreeWidgetItem(cells));
+        auto *item = new QTreeWidgetItem(cells);
+        item->setToolTip(2, plainToolTip(remark.text));
+        items.append(item);
     }
     const int current = remarkList_->indexOfTopLevelItem(remarkList_->currentItem());
     remarkList_->clear();
@@ -201,13 +204,13 @@ void TemplateWindow::cursorMoved()
     if (outlined_.size() + 1 != edit_->document()->characterCount()) {
         return; // the text has changed, and its outline follows in a moment
     }
-    const OutlineTemplate *here = outline_.templateAt(position);
+    const OutlineTemplate *here = outline_->templateAt(position);
     const QString name = here != nullptr ? here->name.text : QString();
     if (data_.isSample() && name != templateName_->text()) {
         requestPages(); // another template of the file is looked at
         return;
     }
-    const OutlineField *field = outline_.fieldAt(position);
+    const OutlineField *field = outline_->fieldAt(position);
     const TextRange element = field != nullptr ? field->element : TextRange();
     edit_->setField(element);
     page_->mark(shifted(element, outlined_, pagesText_));

@@ -46,7 +46,9 @@ public:
     void setData(const TemplateData &data);
     const TemplateData &data() const { return data_; }
     /// Whether the pages are those of the text as it is, or the text is known to be broken.
-    bool isUpToDate() const;
+    bool arePagesUpToDate() const { return shown_ == requested_; }
+    /// The same of the remarks as well.
+    bool isUpToDate() const { return arePagesUpToDate() && checked_ == requested_; }
 
     TemplateTextEdit &edit() const { return *edit_; }
     TemplatePage &page() const { return *page_; }
@@ -103,11 +105,12 @@ private:
     EditableText file_;
     QDateTime now_; ///< of reports that do not say theirs: the same as long as the window is open
     TemplateData data_;
-    TemplateOutline outline_; ///< of the text
-    QString outlined_;        ///< the text that it is of
-    QString pagesText_;       ///< the text that the pages are of
+    std::shared_ptr<const TemplateOutline> outline_ = std::make_shared<TemplateOutline>(); ///< of the text
+    QString outlined_;                                                                     ///< the text that it is of
+    QString pagesText_; ///< the text that the pages are of
     quint64 requested_ = 0;
-    quint64 shown_ = 0; ///< the request that was answered last
+    quint64 shown_ = 0;   ///< the request that the pages are of
+    quint64 checked_ = 0; ///< the request that the remarks are of
     bool isLoading_ = false;
 
     TemplateTextEdit *edit_ = nullptr;

@@ -134,16 +134,17 @@ void TemplateWindow::makeBody()
     dataLabel->setBuddy(dataChoice_);
     templateName_ = plainLabel();
     templateName_->setAccessibleName(Xlate("Template"));
+    constexpr int gap = 6;
     message_ = plainLabel();
     message_->setObjectName(QStringLiteral("message"));
     message_->setAccessibleName(Xlate("State of the pages"));
     message_->setWordWrap(true);
+    message_->setMargin(gap);
     message_->setTextInteractionFlags(Qt::TextSelectableByMouse | Qt::TextSelectableByKeyboard);
     message_->hide();
     auto *right = new QWidget;
     auto *rightLayout = new QVBoxLayout(right);
     auto *row = new QHBoxLayout;
-    constexpr int gap = 6;
     row->setContentsMargins(gap, gap, gap, 0);
     row->addWidget(dataLabel);
     row->addWidget(dataChoice_, 1);
