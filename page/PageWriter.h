@@ -76,6 +76,9 @@ public:
     qint64 lastPieceStart() const { return lastPieceStart_; }
     /// Exchanges the text for another one. @param lineEnds  counted as if they had been written
     void exchangeText(ReportText &text, std::vector<qint64> pageStarts, qint64 lineEnds);
+    /// Exchanges all that was written with another writer's: the text with its pages and its outline, the counters, the
+    /// header and the heading, and the lines of a page. Observers and outlets stay, and are not notified.
+    void exchangeContent(PageWriter &other) noexcept;
     /// Replaces a piece of the text and carries the page starts along.
     /// @return false, changing nothing, for a piece that is not in the text or when there is no memory
     bool replace(qint64 at, qint64 removed, QStringView inserted);

@@ -35,6 +35,22 @@ void PageWriter::exchangeText(ReportText &text, std::vector<qint64> pageStarts, 
     lineCount_ += lineEnds;
 }
 
+void PageWriter::exchangeContent(PageWriter &other) noexcept
+{
+    text_.swap(other.text_);
+    std::swap(starts_, other.starts_);
+    std::swap(outline_, other.outline_);
+    std::swap(losses_, other.losses_);
+    std::swap(lineNumber_, other.lineNumber_);
+    std::swap(lineCount_, other.lineCount_);
+    std::swap(pageNumber_, other.pageNumber_);
+    std::swap(linesPerPage_, other.linesPerPage_);
+    std::swap(headerFlag_, other.headerFlag_);
+    std::swap(hasPageMarks_, other.hasPageMarks_);
+    std::swap(headerLine_, other.headerLine_);
+    std::swap(heading_, other.heading_);
+}
+
 bool PageWriter::replace(qint64 at, qint64 removed, QStringView inserted)
 {
     if (at < 0 || removed < 0 || at > text_.size() || removed > text_.size() - at) {

@@ -18,6 +18,28 @@ void ReportAccess::takeText(UReportDoc &report, LoadedText &text)
     report.SetModifiedFlag(true);
 }
 
+void ReportAccess::takeContent(UReportDoc &report, UReportDoc &made)
+{
+    ReportParts &own = *report.parts_;
+    ReportParts &other = *made.parts_;
+    const bool flowsOnSheets = own.layout.givenLinesPerPage() && !own.layout.isGiven();
+    ++own.editCount;
+    own.page.exchangeContent(other.page);
+    std::swap(own.layout, other.layout);
+    std::swap(own.data, other.data);
+    std::swap(own.data.ownPrintHash, other.data.ownPrintHash); // it belongs to the surroundings, which stay
+    std::swap(own.chainageLabel, other.chainageLabel);
+    std::swap(own.writeTableName, other.writeTableName);
+    std::swap(own.reportFileName, other.reportFileName);
+    own.mirrors.image.clear();
+    own.openedFromRtf = false;
+    if (flowsOnSheets && own.layout.givenLinesPerPage()) {
+        report.UseGivenPage(false);
+        report.SetPageSize();
+    }
+    report.SetModifiedFlag(true);
+}
+
 void ReportAccess::setHooks(UReportDoc &report, const ReportHooks &hooks)
 {
     ReportParts &parts = *report.parts_;

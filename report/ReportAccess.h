@@ -31,6 +31,12 @@ struct ReportAccess
     /// @param text  receives the text before it
     static void takeText(UReportDoc &report, LoadedText &text);
 
+    /// Takes over all that was written into another report, with its page, its outline and its template, in a time that does
+    /// not grow with it: the report is then as if it had been written itself. Title, file, windows and views stay, and
+    /// neither of them is notified. Pages that the user has put on paper as the sheet takes them stay so.
+    /// @param made  receives what the report held before
+    static void takeContent(UReportDoc &report, UReportDoc &made);
+
     /// Sets what is written from now on is written with. With placeholders its pages have page marks.
     static void setHooks(UReportDoc &report, const ReportHooks &hooks);
     static const ReportHooks &hooks(const UReportDoc &report);

@@ -61,6 +61,17 @@ bool ReportLines::append(QStringView line)
     }
 }
 
+void ReportLines::clear()
+{
+    beginResetModel();
+    lines_.clear();
+    blocks_.clear();
+    used_ = 0;
+    size_ = 0;
+    published_ = 0;
+    endResetModel();
+}
+
 void ReportLines::publish()
 {
     if (hasUnpublished()) {

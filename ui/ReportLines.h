@@ -21,6 +21,8 @@ public:
 
     /// Adds a line after the last. @return false, with nothing added, when there is no memory
     bool append(QStringView line);
+    /// Takes all lines out. Views learn of it at once.
+    void clear();
     /// Lines that were added, published or not.
     int count() const { return static_cast<int>(lines_.size()); }
     bool hasUnpublished() const { return count() > published_; }

@@ -48,6 +48,47 @@ void ReportEdit::goTo(const Place &place)
     horizontalScrollBar()->setValue(place.left);
 }
 
+ReportEdit::LinePlace ReportEdit::linePlace()
+{
+    if (isWaiting() && wanted_.position >= length_) {
+        finishLoading(); // the place is in what is missing
+    }
+    const QTextCursor cursor = textCursor();
+    const QTextBlock anchor = document()->findBlock(cursor.anchor());
+    return {anchor.blockNumber(),     cursor.anchor() - anchor.position(), cursor.blockNumber(),
+            cursor.positionInBlock(), verticalScrollBar()->value(),        horizontalScrollBar()->value()};
+}
+
+/// The position of a column of a line, or the last one that there is.
+int ReportEdit::positionOf(int line, int column) const
+{
+    const QTextBlock block = document()->findBlockByNumber(std::min(line, document()->blockCount() - 1));
+    const bool isBeyond = line >= document()->blockCount();
+    return block.position() + (isBeyond ? block.length() - 1 : std::min(column, block.length() - 1));
+}
+
+void ReportEdit::goToLinePlace(const LinePlace &place)
+{
+    constexpr int mostShown = 500; // no window shows more lines
+    loadToLine(std::max({place.anchorLine, place.line, place.top + mostShown}));
+    QTextCursor cursor(document());
+    cursor.setPosition(positionOf(place.anchorLine, place.anchorColumn));
+    cursor.setPosition(positionOf(place.line, place.column), QTextCursor::KeepAnchor);
+    setTextCursor(cursor);
+    verticalScrollBar()->setValue(place.top);
+    horizontalScrollBar()->setValue(place.left);
+}
+
+void ReportEdit::goToLine(int line)
+{
+    constexpr int mostShown = 500;
+    loadToLine(line + mostShown);
+    QTextCursor cursor(document());
+    cursor.setPosition(positionOf(line, 0));
+    setTextCursor(cursor);
+    centerCursor();
+}
+
 void ReportEdit::watch()
 {
     noteLength();

@@ -79,6 +79,24 @@ public:
     int firstVisibleLine() const { return firstVisibleBlock().blockNumber(); }
     qint64 windowTextLength() const { return qint64(length_) + lineEnds_; }
 
+    /// Where the cursor and the window are in lines and columns, from 0: another text of the same lines has the same places.
+    struct LinePlace
+    {
+        int anchorLine = 0; ///< the other end of the selection
+        int anchorColumn = 0;
+        int line = 0;
+        int column = 0;
+        int top = 0; ///< of the scroll bars
+        int left = 0;
+    };
+    LinePlace linePlace();
+    /// Goes to such a place, as far as there is text: lines and columns beyond it become the last ones. What is missing of a
+    /// text that is loaded in pieces is loaded at once up to there.
+    void goToLinePlace(const LinePlace &place);
+    /// Puts the cursor at the beginning of a line and shows it in the middle of the window.
+    /// @param line  from 0; one beyond the text becomes the last one
+    void goToLine(int line);
+
     /// Percent of the size that the fonts name; printing and saving do not depend on it.
     int zoomPercent() const { return zoom_; }
     /// @param percent  brought into 25 to 500
@@ -116,6 +134,8 @@ private:
     void goTo(const Place &place);
     void take(QTextDocument *loaded);
     void loadPiece();
+    void loadToLine(int line);
+    int positionOf(int line, int column) const;
     void endLoading();
     void watch();
     void noteEdit(int position, int removed, int added);

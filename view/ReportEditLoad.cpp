@@ -96,6 +96,18 @@ void ReportEdit::loadPiece()
     }
 }
 
+/// Loads what is missing at once, up to a line.
+void ReportEdit::loadToLine(int line)
+{
+    isScrolled_ = true; // the window goes to that line, and not to the place that it was at before
+    while (isLoading() && document()->blockCount() <= line) {
+        loader_->addPiece();
+        if (loader_->isDone()) {
+            endLoading();
+        }
+    }
+}
+
 void ReportEdit::finishLoading()
 {
     if (isLoading()) {
