@@ -15,7 +15,11 @@
 #include <QDir>
 #include <QFileInfo>
 #include <QJsonArray>
+#include <QLocale>
 #include <QStringList>
+
+#include <algorithm>
+#include <iterator>
 
 namespace kareport
 {
@@ -255,6 +259,16 @@ Job readRoot(const JsonNode &root, const QDir &folder, bool isOnInput, const Job
 }
 
 } // namespace
+
+QString paperKey(PaperSize paper)
+{
+    if (paper == PaperSize::ByLocale) {
+        paper = QLocale::system().measurementSystem() == QLocale::ImperialUSSystem ? PaperSize::Letter : PaperSize::A4;
+    }
+    const auto *row =
+        std::find_if(std::begin(papers), std::end(papers), [paper](const auto &other) { return other.paper == paper; });
+    return row->key.toString();
+}
 
 Expected<Job> readJob(const JsonSource &source, const JobDefaults &defaults)
 {
