@@ -1,5 +1,6 @@
 #include "JobSteps.h"
 
+#include "DictionaryVariables.h"
 #include "NearestName.h"
 #include "PageMark.h"
 #include "ReportOutline.h"
@@ -175,16 +176,7 @@ Expected<std::unique_ptr<RowList>> JobSteps::openRows(const QString &data, const
     const UXmlReportTpl *tpl = report_.GetTemplate();
     const JobData::VariablesIn variablesIn = [this, tpl, dictionary, shown](const DataUnits &units) {
         units_ = units;
-        Variables variables;
-        variables.find = [tpl, units, dictionary](const QString &variable) -> std::optional<ValueParser> {
-            qint32 id = 0;
-            qint32 type = 0;
-            if (!tpl->FindVariable(dictionary, variable, id, type)) {
-                return std::nullopt;
-            }
-            return ValueParser(type, static_cast<unsigned>(id), units);
-        };
-        variables.names = variableNames(*tpl->GetDictionary(dictionary));
+        Variables variables = variablesOf(*tpl, dictionary, units);
         if (shown != nullptr) {
             variables.shown.emplace();
             for (const sXmlReportField &field : *shown) {

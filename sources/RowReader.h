@@ -65,6 +65,8 @@ public:
     virtual std::vector<unsigned> ids() const { return binding_.ids(); }
     /// The names of the variables that are read, folded, each once.
     virtual QStringList variables() const { return binding_.variables(); }
+    /// The variables that are read, with the columns that they are read from.
+    const std::vector<BoundField> &fields() const { return binding_.fields(); }
     /// What messages call the source: its file, or a connection.
     virtual QString name() const = 0;
     /// What is wrong with the columns that were chosen, where the data itself is not.

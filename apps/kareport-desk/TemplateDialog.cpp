@@ -1,9 +1,11 @@
 #include "TemplateDialog.h"
 
 #include "Folders.h"
+#include "ImportPanel.h"
 #include "OpenTemplate.h"
 #include "PlainWidgets.h"
 #include "Profile.h"
+#include "UXmlReportTpl.h"
 #include "Xlate.h"
 
 #include <QComboBox>
@@ -46,6 +48,7 @@ TemplateDialog::TemplateDialog(QWidget *parent)
       template_(new QComboBox),
       output_(new QComboBox),
       data_(new QLineEdit),
+      import_(new ImportPanel),
       message_(plainLabel()),
       buttons_(new QDialogButtonBox(QDialogButtonBox::Ok | QDialogButtonBox::Cancel))
 {
@@ -75,8 +78,11 @@ TemplateDialog::TemplateDialog(QWidget *parent)
     landXml_.emplace(*form);
     auto *layout = new QVBoxLayout(this);
     layout->addLayout(form);
+    layout->addWidget(import_, 1);
     layout->addWidget(message_);
     layout->addStretch();
+    import_->setFile(nullptr);
+    import_->setChangedHandler([this] { check(); });
     layout->addWidget(buttons_);
     constexpr int usualWidth = 560;
     resize(usualWidth, sizeHint().height());
@@ -84,10 +90,12 @@ TemplateDialog::TemplateDialog(QWidget *parent)
     connect(browseFile, &QPushButton::clicked, this,
             [this] { browse(*file_, Xlate("Choose a template file"), Xlate("Templates (*.xml);;All files (*)")); });
     connect(browseData, &QPushButton::clicked, this, [this] {
-        browse(*data_, Xlate("Choose a data file"), Xlate("Data (*.csv *.txt *.xml *.landxml);;All files (*)"));
+        browse(*data_, Xlate("Choose a data file"),
+               Xlate("Data (*.csv *.txt *.xml *.landxml *.gpkg *.sqlite *.db);;All files (*)"));
     });
     connect(file_, &QLineEdit::textChanged, this, &TemplateDialog::readTemplates);
     connect(template_, &QComboBox::currentIndexChanged, this, &TemplateDialog::readOutputs);
+    connect(output_, &QComboBox::currentIndexChanged, this, &TemplateDialog::useOutput);
     connect(data_, &QLineEdit::textChanged, this, &TemplateDialog::readData);
     edit_ = buttons_->addButton(Xlate("&Edit Template"), QDialogButtonBox::ActionRole);
     connect(edit_, &QPushButton::clicked, this, [this] {
@@ -106,6 +114,8 @@ TemplateDialog::TemplateDialog(QWidget *parent)
     check();
 }
 
+TemplateDialog::~TemplateDialog() = default;
+
 TemplateJob TemplateDialog::job() const
 {
     TemplateJob job;
@@ -116,6 +126,9 @@ TemplateJob TemplateDialog::job() const
     if (isLandXml_) {
         job.dataKind = QStringLiteral("landxml");
         job.dataOptions = landXml_->keys();
+    } else {
+        job.dataKind = import_->isDatabase() ? QStringLiteral("sqlite") : job.dataKind;
+        job.dataOptions = import_->options();
     }
     return job;
 }
@@ -155,6 +168,7 @@ void TemplateDialog::accept()
         WriteProfileString(QString(), landXmlEntry,
                            QString::fromUtf8(QJsonDocument(landXml_->keys()).toJson(QJsonDocument::Compact)));
     }
+    import_->remember();
     QDialog::accept();
 }
 

@@ -8,6 +8,7 @@
 #include <memory>
 #include <optional>
 
+class UXmlReportTpl;
 class QComboBox;
 class QDialogButtonBox;
 class QLabel;
@@ -17,12 +18,16 @@ class QPushButton;
 namespace kareport
 {
 
-/// Asks for a template file, one of its templates, a table or block of it, and the data file to write through it: CSV, or
-/// LandXML with what is listed of it. What was chosen last time is there again.
+class ImportPanel;
+
+/// Asks for a template file, one of its templates, a table or block of it, and the data file to write through it: a text file
+/// with how it is read, or LandXML with what is listed of it. What was chosen last time is there again, for a text file what
+/// was chosen for one of the same shape.
 class TemplateDialog : public QDialog
 {
 public:
     explicit TemplateDialog(QWidget *parent = nullptr);
+    ~TemplateDialog() override;
 
     TemplateJob job() const;
     void setTemplateFile(const QString &path);
@@ -35,6 +40,7 @@ private:
     void browse(QLineEdit &field, const QString &title, const QString &filter);
     void readTemplates();
     void readOutputs();
+    void useOutput();
     void readData();
     bool readContents(const std::shared_ptr<const FileBytes> &file);
     void check();
@@ -44,7 +50,9 @@ private:
     QComboBox *output_; ///< data: true for a block
     QLineEdit *data_;
     std::optional<LandXmlChoice> landXml_;
-    bool isLandXml_ = false; ///< the data file is
+    ImportPanel *import_;
+    std::unique_ptr<UXmlReportTpl> tpl_; ///< that is chosen; null for none
+    bool isLandXml_ = false;             ///< the data file is
     QLabel *message_;
     QString wrong_;     ///< with the template file
     QString wrongData_; ///< with the data file

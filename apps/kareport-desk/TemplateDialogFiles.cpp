@@ -1,5 +1,9 @@
 #include "TemplateDialog.h"
 
+#include "DictionaryVariables.h"
+#include "ImportGuess.h"
+#include "ImportPanel.h"
+#include "SqlitePreview.h"
 #include "TemplateNames.h"
 #include "TemplateSource.h"
 #include "UXmlReportTpl.h"
@@ -13,6 +17,7 @@
 #include <QLayout>
 #include <QLineEdit>
 #include <QPushButton>
+#include <QSignalBlocker>
 
 #include <algorithm>
 #include <new>
@@ -46,20 +51,40 @@ void TemplateDialog::readTemplates()
 void TemplateDialog::readOutputs()
 {
     const QString chosen = output_->currentText();
-    output_->clear();
-    UXmlReportTpl tpl;
-    if (template_->currentIndex() >= 0 && tpl.LoadTemplate(file_->text(), template_->currentData().toString())) {
-        QStringList names;
-        tpl.GetAllTables(names);
-        for (const QString &name : names) {
-            output_->addItem(name, false);
+    {
+        const QSignalBlocker blocker(output_);
+        output_->clear();
+        tpl_ = std::make_unique<UXmlReportTpl>();
+        if (template_->currentIndex() >= 0 && tpl_->LoadTemplate(file_->text(), template_->currentData().toString())) {
+            QStringList names;
+            tpl_->GetAllTables(names);
+            for (const QString &name : names) {
+                output_->addItem(name, false);
+            }
+            tpl_->GetAllBlocks(names);
+            for (const QString &name : names) {
+                output_->addItem(name, true);
+            }
         }
-        tpl.GetAllBlocks(names);
-        for (const QString &name : names) {
-            output_->addItem(name, true);
-        }
+        output_->setCurrentIndex(qMax(output_->count() > 0 ? 0 : -1, output_->findText(chosen)));
     }
-    output_->setCurrentIndex(qMax(output_->count() > 0 ? 0 : -1, output_->findText(chosen)));
+    useOutput();
+}
+
+/// Tells the import which variables the table or block can show.
+void TemplateDialog::useOutput()
+{
+    const QString name = output_->currentText();
+    const bool isBlock = output_->currentData().toBool();
+    const sXmlReportTable *table = output_->currentIndex() >= 0 && !isBlock ? tpl_->GetTable(name) : nullptr;
+    const sXmlReportBlock *block = output_->currentIndex() >= 0 && isBlock ? tpl_->GetBlock(name) : nullptr;
+    const QString dictionary = table != nullptr ? table->Use : block != nullptr ? block->Use : QString();
+    if (tpl_->GetDictionary(dictionary) == nullptr) {
+        import_->setVariables({});
+    } else {
+        import_->setVariables(
+            [tpl = tpl_.get(), dictionary](const DataUnits &units) { return variablesOf(*tpl, dictionary, units); });
+    }
     check();
 }
 
@@ -69,14 +94,24 @@ void TemplateDialog::readData()
     isLandXml_ = false;
     wrongData_.clear();
     const QString path = data_->text();
+    std::shared_ptr<const FileBytes> text;
+    bool isDatabase = false;
     if (QFileInfo(path).isFile()) { // a pipe or a device might never end
         const auto file = FileBytes::open(path);
         if (const auto *opened = std::get_if<std::shared_ptr<const FileBytes>>(&file)) {
-            isLandXml_ = isLandXml(*opened) && readContents(*opened);
+            const bool isXml = isLandXml(*opened);
+            isLandXml_ = isXml && readContents(*opened);
+            isDatabase = isSqlite((*opened)->view());
+            text = isXml || isDatabase ? nullptr : beginOfText(*opened);
         }
     }
     if (!isLandXml_) {
         landXml_->clear();
+    }
+    if (isDatabase) {
+        import_->setDatabase(QFileInfo(path).absoluteFilePath());
+    } else {
+        import_->setFile(text);
     }
     check();
     layout()->activate();
@@ -126,6 +161,10 @@ void TemplateDialog::check()
     if (message.isEmpty()) {
         message = wrongData_;
     }
+    const bool canRun = message.isEmpty();
+    if (message.isEmpty()) {
+        message = import_->problem(); // the run says it as well, should the user want to see it
+    }
     if (!message.isEmpty()) {
         message[0] = message[0].toUpper(); // the error of a file is the end of a sentence
     }
@@ -134,7 +173,7 @@ void TemplateDialog::check()
         edit_->setEnabled(QFileInfo(file_->text()).isFile());
     }
     buttons_->button(QDialogButtonBox::Ok)
-        ->setEnabled(message.isEmpty() && output_->currentIndex() >= 0 && !data_->text().isEmpty());
+        ->setEnabled(canRun && output_->currentIndex() >= 0 && !data_->text().isEmpty());
 }
 
 } // namespace kareport

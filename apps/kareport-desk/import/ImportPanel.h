@@ -1,0 +1,98 @@
+#pragma once
+
+#include "ColumnBinding.h"
+#include "ColumnMapping.h"
+#include "DataPreview.h"
+#include "DataUnits.h"
+#include "FileBytes.h"
+
+#include <QGroupBox>
+#include <QJsonObject>
+#include <QString>
+
+#include <functional>
+#include <memory>
+#include <vector>
+
+class QCheckBox;
+class QComboBox;
+class QFormLayout;
+class QLineEdit;
+class QTableWidget;
+
+namespace kareport
+{
+
+/// Asks how data is read. Of a text file of rows and cells: delimiter, decimal sign, encoding, header row or order of the columns, the
+/// variables of the columns and the units of the numbers; and shows the first rows as they are read then. What does not fit is
+/// red, and its tool tip says why. Of a SQLite database or a GeoPackage: the table, the variables of its columns and the units.
+///
+/// A file begins with what was chosen for the last one of its shape, or else with what can be found out.
+class ImportPanel : public QGroupBox
+{
+public:
+    /// Gives the variables that are wanted, for numbers in units; none while there is no dictionary.
+    using VariablesIn = std::function<Variables(const DataUnits &)>;
+
+    explicit ImportPanel(QWidget *parent = nullptr);
+
+    /// Shows a file; null shows none. @param begin  the beginning of the file, as `beginOfText` makes it
+    void setFile(std::shared_ptr<const FileBytes> begin);
+    /// Shows a database, whose file is there.
+    void setDatabase(const QString &file);
+    /// Says which variables are wanted. Choices that they do not have are forgotten.
+    void setVariables(const VariablesIn &variablesIn);
+    /// Called when something was chosen.
+    void setChangedHandler(std::function<void()> handler) { changed_ = std::move(handler); }
+
+    bool hasFile() const { return begin_ != nullptr || isDatabase(); }
+    bool isDatabase() const { return !database_.isEmpty(); }
+    /// The keys of a data set that say what is chosen, as far as they are not the defaults.
+    QJsonObject options() const;
+    /// What is wrong with the first rows; empty where they can be read.
+    QString problem() const;
+    /// Keeps what is chosen for files of the same shape.
+    void remember() const;
+
+    QTableWidget &table() const { return *table_; }
+
+private:
+    QJsonObject ownOptions() const;
+    void putOptions(const QJsonObject &options);
+    void begin();
+    void forgetUnknown();
+    void change(bool isOfColumns);
+    void preview();
+    void beginTable();
+    DataPreview previewWith(const QJsonObject &options, int rows) const;
+    void showFields();
+    void showColumns();
+    void showRows();
+
+    QFormLayout *left_;
+    QFormLayout *right_;
+    QComboBox *databaseTable_;
+    QComboBox *delimiter_;
+    QComboBox *decimal_;
+    QComboBox *encoding_;
+    QCheckBox *header_;
+    QLineEdit *order_;
+    QComboBox *length_;
+    QComboBox *area_;
+    QComboBox *angle_;
+    QTableWidget *table_;                    ///< its first row has the variables
+    std::shared_ptr<const FileBytes> begin_; ///< null for a database
+    QString database_;                       ///< empty for a text file
+    QString wrongDatabase_;                  ///< why its tables cannot be listed
+    VariablesIn variablesIn_;
+    QString shape_;
+    QJsonObject kept_; ///< keys that were remembered and are not shown
+    ColumnMapping mapping_;
+    DataPreview own_; ///< without what was chosen for columns
+    DataPreview preview_;
+    bool isChosen_ = false;  ///< the user has chosen something since the file came
+    bool isFilling_ = false; ///< the lists are filled, and nobody chooses anything
+    std::function<void()> changed_;
+};
+
+} // namespace kareport
