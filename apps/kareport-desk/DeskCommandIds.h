@@ -19,7 +19,14 @@ enum DeskCommandId : unsigned
     viewPageLinesCommand = 33273,
     fitWidthCommand = 33274,
     fitPageCommand = 33275,
-    printSelectionCommand = 33276
+    printSelectionCommand = 33276,
+    runAgainCommand = 33280,
+    runWhenChangedCommand = 33281,
+    saveAsJobCommand = 33282,
+    viewUnitsBarCommand = 33283,
+    chooseUnitsCommand = 33284,
+    viewNotesCommand = 33285,
+    goToNotesCommand = 33286
 };
 
 } // namespace kareport

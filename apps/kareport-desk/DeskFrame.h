@@ -1,5 +1,6 @@
 #pragma once
 
+#include "DeskRuns.h"
 #include "EditorHold.h"
 #include "FileWatch.h"
 #include "JobExport.h"
@@ -11,7 +12,6 @@
 #include <QLatin1StringView>
 
 #include <functional>
-#include <map>
 #include <optional>
 
 class QMenu;
@@ -55,6 +55,9 @@ public:
     /// Asks for template and data, beginning with a template file that may be empty; a test answers instead.
     std::function<std::optional<kareport::TemplateJob>(const QString &templateFile)> askTemplate;
 
+    /// The reports that jobs made, and how they are made again.
+    kareport::DeskRuns &runs() { return runs_; }
+
     /// Asks where the values of a report go; a test answers instead.
     std::function<std::optional<QString>(const kareport::SaveRequest &)> askExport;
 
@@ -75,13 +78,11 @@ private:
     void askPreferences();
     /// Writes the values of the report in front into a file of another program.
     void exportValues();
-    /// What the report in front was made of; null for one that no job made.
-    const kareport::JobOrigin *originInFront() const;
     /// Shows what a file holds that its report does not show, if anything.
     static void sayWhatIsNotShown(const QString &path, const kareport::ReadNotes &notes);
     bool finishOpening(UDocument *report, const QString &error);
-    /// Runs a job, and says what there is to note on its report.
-    bool openJob(const QString &path);
+    /// Runs a job. What there is to note on its report is shown beside it.
+    bool openJob(const kareport::ReportRecipe &recipe);
     /// The report of a file, which is opened where it is not open.
     UDocument *openReport(const QString &file, kareport::ReadNotes &notes);
     /// Opens a report by any means, while its file counts as being opened: what changes in it meanwhile is reported.
@@ -112,9 +113,9 @@ private:
     std::vector<kareport::Command> commands_;
     QMenu *recentFiles_ = nullptr;
     QToolBar *toolBar_ = nullptr;
-    QStringList reading_;                                      ///< files that are being opened now
-    std::map<const UDocument *, kareport::JobOrigin> origins_; ///< of the reports that jobs made
+    QStringList reading_; ///< files that are being opened now
     kareport::FileWatch files_;
     kareport::Recovery recovery_;
     kareport::EditorHold editors_;
+    kareport::DeskRuns runs_{*this};
 };

@@ -46,26 +46,6 @@ bool holdsLandXml(const QString &path)
     return opened != nullptr && kareport::isLandXml(*opened);
 }
 
-/// Says how many notes there are on a report that was made, and the first of them.
-void sayNotes(const kareport::JobNotes &notes)
-{
-    constexpr qsizetype mostShown = 20;
-    QStringList lines;
-    const std::vector<kareport::JobNote> said = notes.said();
-    for (const kareport::JobNote &note : said) {
-        if (lines.size() == mostShown) {
-            lines.append(QStringLiteral("…"));
-            break;
-        }
-        lines.append(note.message());
-    }
-    if (!lines.isEmpty()) {
-        kareport::showMessage({Xlate("The report was made. Notes on its data: %1\n\n%2")
-                                   .arg(QString::number(said.size()), lines.join(u'\n')),
-                               QString(), MessageButtons::Ok, kareport::MessageIcon::Information});
-    }
-}
-
 } // namespace
 
 void DeskFrame::sayWhatIsNotShown(const QString &path, const kareport::ReadNotes &notes)
@@ -91,30 +71,16 @@ bool DeskFrame::finishOpening(UDocument *report, const QString &error)
 
 bool DeskFrame::OpenTemplateJob(const kareport::TemplateJob &job)
 {
-    QString error;
-    kareport::JobNotes notes;
-    UDocument *report = kareport::launchTemplateJob(job, this, error, notes);
-    const bool isMade = finishOpening(report, error);
-    if (isMade) {
-        origins_.insert_or_assign(report, job);
-        sayNotes(notes);
-    }
-    return isMade;
-}
-
-const kareport::JobOrigin *DeskFrame::originInFront() const
-{
-    const auto found = origins_.find(GetCommandDocument());
-    return found != origins_.end() ? &found->second : nullptr;
+    return openJob(job);
 }
 
 void DeskFrame::exportValues()
 {
-    const kareport::JobOrigin *found = originInFront();
+    const kareport::ReportRecipe *found = runs_.recipeInFront();
     if (found == nullptr) {
         return;
     }
-    const kareport::JobOrigin origin = *found; // the report may be closed while the dialog is open
+    const kareport::ReportRecipe recipe = *found; // the report may be closed while the dialog is open
     kareport::SaveRequest request;
     request.filter = kareport::exportFilter();
     request.initialFolder = GetInitialOpenDir(kareport::lastReportFolder);
@@ -125,7 +91,7 @@ void DeskFrame::exportValues()
     }
     SetLastOpenDir(*file, kareport::lastReportFolder);
     QStringList warnings;
-    const QString problem = kareport::launchExport(origin, *file, this, warnings);
+    const QString problem = kareport::launchExport(recipe, *file, this, warnings);
     if (!problem.isEmpty()) {
         AppMessageBox(problem);
     } else if (!warnings.isEmpty()) {
@@ -165,17 +131,15 @@ bool DeskFrame::OpenFile(const QString &path)
     return isOpened;
 }
 
-bool DeskFrame::openJob(const QString &path)
+bool DeskFrame::openJob(const kareport::ReportRecipe &recipe)
 {
     QString error;
-    kareport::JobNotes notes;
-    UDocument *report = kareport::launchJob(path, this, error, notes);
+    UDocument *report = runs_.run(recipe, error);
     const bool isMade = finishOpening(report, error);
-    if (isMade) {
-        origins_.insert_or_assign(report, path);
-        UApplication::Get()->AddToRecentFileList(path);
-        sayNotes(notes);
+    if (isMade && !recipe.jobFile().isEmpty()) {
+        UApplication::Get()->AddToRecentFileList(recipe.jobFile());
     }
+    runs_.showFront();
     return isMade;
 }
 
@@ -211,7 +175,7 @@ void DeskFrame::NoteDocumentEvent(UDocument &document, UDocument::DocumentEvent 
     if (event == UDocument::DocumentEvent::AfterCloseDocument) {
         recovery_.forget(dynamic_cast<const UReportDoc *>(&document));
         editors_.forget(dynamic_cast<const UReportDoc *>(&document));
-        origins_.erase(&document);
+        runs_.forget(&document);
     }
     // A document that has just been opened or saved under a new name gets its path after the event.
     QMetaObject::invokeMethod(

@@ -22,7 +22,7 @@ std::vector<kareport::Command> DeskFrame::makeCommands()
         {fileOpenCommand, [this] { open(); }, {}},
         {fileFromTemplateCommand, [this] { fromTemplate(QString()); }, {}},
         {fileExportCommand, [this] { exportValues(); },
-         [this](CommandState &state) { state.enabled = originInFront() != nullptr; }},
+         [this](CommandState &state) { state.enabled = runs_.recipeInFront() != nullptr; }},
         {preferencesCommand, [this] { askPreferences(); }, {}},
         {recentFileCommand,
          {},
@@ -43,6 +43,8 @@ std::vector<kareport::Command> DeskFrame::makeCommands()
         {helpContentsCommand, [this] { about(); }, {}},
     };
     commands.insert(commands.begin(), own.begin(), own.end());
+    const std::vector<Command> ofRuns = runs_.commands();
+    commands.insert(commands.end(), ofRuns.begin(), ofRuns.end());
     return commands;
 }
 
@@ -89,6 +91,7 @@ void DeskFrame::makeMenus()
     toolBar_->setObjectName(QStringLiteral("toolbar"));
     toolBar_->addAction(CommandAction(fileSaveCommand));
     toolBar_->addAction(CommandAction(filePrintCommand));
+    runs_.addTo(menu);
 }
 
 void DeskFrame::fillRecentFiles()

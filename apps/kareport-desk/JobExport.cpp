@@ -25,14 +25,6 @@ namespace kareport
 namespace
 {
 
-Expected<JsonSource> readOrigin(const JobOrigin &origin)
-{
-    if (const auto *path = std::get_if<QString>(&origin)) {
-        return JsonSource::read(*path);
-    }
-    return JsonSource::fromObject(std::get<TemplateJob>(origin).toJson());
-}
-
 /// What keeps a job from having the file for its output.
 QString wrongExport(const Job &job, const QString &path)
 {
@@ -99,13 +91,13 @@ QString exportFilter()
            Xlate("Rows as JSON Lines") + QStringLiteral(" (*.jsonl)|*.jsonl||");
 }
 
-QString exportJob(const JobOrigin &origin, const QString &file, Progress &progress, QStringList &warnings)
+QString exportJob(const ReportRecipe &recipe, const QString &file, Progress &progress, QStringList &warnings)
 {
     const auto kind = outputKindOf(file);
     if (!kind || !isMadeOfResults(*kind)) {
         return Xlate("\"%1\": one of the endings .xlsx, .html, .csv and .jsonl was expected").arg(file);
     }
-    const auto read = readOrigin(origin);
+    const auto read = sourceOf(recipe);
     if (const InputError *wrong = errorOf(read)) {
         return wrong->message();
     }

@@ -1,18 +1,13 @@
 #pragma once
 
-#include "Job.h"
 #include "Progress.h"
+#include "ReportRecipe.h"
 
 #include <QString>
 #include <QStringList>
 
-#include <variant>
-
 namespace kareport
 {
-
-/// What a report was made of: a job file, or a template and a data file.
-using JobOrigin = std::variant<QString, TemplateJob>;
 
 /// What a save dialog offers for the values of a report, as `SaveRequest::filter`.
 QString exportFilter();
@@ -21,6 +16,6 @@ QString exportFilter();
 /// The job runs again for it, without its own outputs: what was typed into the report is not in the file.
 /// @param warnings  receive what a reader of the file should know
 /// @return what went wrong; empty when the file was written, or the work was stopped
-QString exportJob(const JobOrigin &origin, const QString &file, Progress &progress, QStringList &warnings);
+QString exportJob(const ReportRecipe &recipe, const QString &file, Progress &progress, QStringList &warnings);
 
 } // namespace kareport

@@ -1,22 +1,17 @@
 #include "JobLauncher.h"
 
 #include "CViewPane.h"
-#include "DataKind.h"
-#include "DeskPreferences.h"
 #include "Interrupt.h"
-#include "JobReader.h"
+#include "JobFiles.h"
 #include "JobRunner.h"
-#include "Progress.h"
+#include "ReportReplacing.h"
 #include "ReportWindow.h"
 #include "ReportWindowEntry.h"
-#include "ValueGuard.h"
-#include "WorkDialog.h"
+#include "UXmlReportTpl.h"
 #include "Xlate.h"
 
-#include <QCoreApplication>
 #include <QFileInfo>
 
-#include <algorithm>
 #include <new>
 
 namespace kareport
@@ -24,35 +19,6 @@ namespace kareport
 
 namespace
 {
-
-/// Shows progress in a dialog, and lets the windows answer while the work runs.
-class DialogProgress : public Progress
-{
-public:
-    explicit DialogProgress(QWidget *parent) : Progress(true), dialog_(parent, [] { setInterrupted(true); }) {}
-
-    void finish() override { dialog_.hide(); }
-
-protected:
-    void show(std::size_t done) override
-    {
-        if (!dialog_.isDue()) {
-            QCoreApplication::processEvents(QEventLoop::ExcludeUserInputEvents);
-            return;
-        }
-        dialog_.show(what(), total() > 0 ? static_cast<int>(std::min(done, total()) * 100 / total()) : -1);
-        QCoreApplication::processEvents();
-    }
-
-private:
-    WorkDialog dialog_;
-};
-
-bool &runningJob()
-{
-    static bool isRunning = false;
-    return isRunning;
-}
 
 void closeReport(UReportDoc *report)
 {
@@ -80,27 +46,6 @@ UReportDoc *makeShown(bool header, const QString &caption)
     return report;
 }
 
-/// The data file of a job that is not a regular file: reading a pipe or a device might never end, and nothing could
-/// stop it.
-std::optional<InputError> dataThatIsNoFile(const Job &job, const JsonSource &source)
-{
-    QStringList names = job.data.keys();
-    names.sort();
-    for (const QString &name : names) {
-        const Job::DataSet &set = *job.data.constFind(name);
-        const JsonPath place = {QStringLiteral("data"), name, set.kind};
-        if (set.source->readsStandardInput()) {
-            return source.errorAt(place, Xlate("a window has no standard input: a file was expected"));
-        }
-        for (const QString &file : set.source->files()) {
-            if (QFileInfo(file).exists() && !QFileInfo(file).isFile()) {
-                return source.errorAt(place, unreadableData(file, Xlate("it is a folder, a pipe or a device")));
-            }
-        }
-    }
-    return std::nullopt;
-}
-
 /// Ends rich-text mode, which belongs to the files of a job: while it is on, the view shows what was written, and neither
 /// what is typed nor what is loaded.
 void endRichTextMode(UReportDoc *report)
@@ -110,104 +55,115 @@ void endRichTextMode(UReportDoc *report)
     }
 }
 
+/// The title that a report has been given, whatever number was put after it.
+QString givenTitle(const Job &job, const UReportDoc &report)
+{
+    const UXmlReportTpl *used = report.GetTemplate();
+    return job.title.value_or(used != nullptr ? used->GetTemplateTitle() : QString());
+}
+
 /// Runs a job that has been read. @return the report; null when it was not made
-UReportDoc *makeReport(const Job &job, const JsonSource &source, QWidget *parent, QString &error, JobNotes &notes)
+UReportDoc *makeReport(const Job &job, const JsonSource &source, QWidget *parent, LaunchResult &result)
 {
     DialogProgress progress(parent);
     UReportDoc *report = makeShown(job.header, job.title.value_or(QFileInfo(source.path()).completeBaseName()));
     if (report == nullptr) {
-        error = InputError{source.path(), std::nullopt, Xlate("the report could not be made")}.message();
+        result.error = InputError{source.path(), std::nullopt, Xlate("the report could not be made")}.message();
         return nullptr;
     }
     std::optional<InputError> wrong;
     try {
         JobRunner runner(job, source, progress);
         wrong = runner.run(*report);
-        notes = runner.notes();
+        result.notes = runner.notes();
     } catch (const std::bad_alloc &) {
         endRichTextMode(report);
         closeReport(report); // half a report counts as none
         throw;
     }
     if (wrong) {
-        error = wrong->message();
+        result.error = wrong->message();
     }
     endRichTextMode(report);
     if (wrong || isInterrupted()) {
         closeReport(report);
         return nullptr;
     }
+    result.title = givenTitle(job, *report);
     setWindowCaption(*report, report->GetTitle());
     report->SetReportWindowActive();
     return report;
 }
 
-UReportDoc *runJob(const Expected<JsonSource> &read, QWidget *parent, QString &error, JobNotes &notes)
+/// Runs a job that has been read, aside, and puts what it makes into a report. @return whether it did
+bool makeAgain(UReportDoc &report, const Job &job, const JsonSource &source, QWidget *parent, LaunchResult &result,
+               const LaunchHooks &hooks)
 {
-    if (const InputError *wrong = errorOf(read)) {
-        error = wrong->message();
-        return nullptr;
+    DialogProgress progress(parent);
+    WrittenReport made(surroundingsOf(job), report);
+    JobRunner runner(job, source, progress);
+    const auto wrong = runner.run(made.report());
+    endRichTextMode(&made.report());
+    progress.finish();
+    if (wrong) {
+        result.error = wrong->message();
     }
-    const auto &source = std::get<JsonSource>(read);
-    const auto job = readJob(source, loadPreferences().jobDefaults());
-    if (const InputError *wrong = errorOf(job)) {
-        error = wrong->message();
-        return nullptr;
+    // The question may be open for long, and the report closed by then.
+    if (wrong || isInterrupted() || !UReportDoc::IsReportAvailable(&report) ||
+        (hooks.mayReplace && !hooks.mayReplace()) || !UReportDoc::IsReportAvailable(&report))
+    {
+        return false;
     }
-    if (const auto wrong = dataThatIsNoFile(std::get<Job>(job), source)) {
-        error = wrong->message();
-        return nullptr;
+    result.notes = runner.notes();
+    const QString title = givenTitle(job, made.report());
+    if (title != result.title && report.GetPathName().isEmpty()) { // a report that was saved has the name of its file
+        report.SetTitle(title);
+        setWindowCaption(report, report.GetTitle());
     }
-    return makeReport(std::get<Job>(job), source, parent, error, notes);
+    result.title = title;
+    made.putInto(report);
+    return true;
 }
 
-template <typename Read>
-UReportDoc *launch(const Read &read, QWidget *parent, QString &error, JobNotes &notes)
+void tellFiles(const LaunchHooks &hooks, const Job &job, const JsonSource &source)
 {
-    if (runningJob()) {
-        error = Xlate("Another job is running. Wait until it has finished, or cancel it.");
-        return nullptr;
-    }
-    const ValueGuard running(runningJob(), true, [](bool on) { runningJob() = on; });
-    setInterrupted(false);
-    try {
-        return runJob(read(), parent, error, notes);
-    } catch (const std::bad_alloc &) {
-        error = Xlate("There is not enough memory for this input.");
-        return nullptr;
+    if (hooks.aboutToRead) {
+        hooks.aboutToRead(watchedFiles(job, source.path()));
     }
 }
 
 } // namespace
 
-bool isJobRunning()
+UReportDoc *launchJob(const ReportRecipe &recipe, QWidget *parent, LaunchResult &result, const LaunchHooks &hooks)
 {
-    return runningJob();
+    UReportDoc *report = nullptr;
+    doWithJob(recipe, result.error, [&](const Job &job, const JsonSource &source) {
+        tellFiles(hooks, job, source);
+        report = makeReport(job, source, parent, result);
+    });
+    return report;
 }
 
-UReportDoc *launchJob(const QString &path, QWidget *parent, QString &error, JobNotes &notes)
+bool launchAgain(UReportDoc &report, const ReportRecipe &recipe, QWidget *parent, LaunchResult &result,
+                 const LaunchHooks &hooks)
 {
-    return launch([&path] { return JsonSource::read(path); }, parent, error, notes);
+    bool isMade = false;
+    doWithJob(recipe, result.error, [&](const Job &job, const JsonSource &source) {
+        tellFiles(hooks, job, source);
+        isMade = makeAgain(report, job, source, parent, result, hooks);
+    });
+    return isMade;
 }
 
-QString launchExport(const JobOrigin &origin, const QString &file, QWidget *parent, QStringList &warnings)
+QString launchExport(const ReportRecipe &recipe, const QString &file, QWidget *parent, QStringList &warnings)
 {
-    if (runningJob()) {
-        return Xlate("Another job is running. Wait until it has finished, or cancel it.");
-    }
-    const ValueGuard running(runningJob(), true, [](bool on) { runningJob() = on; });
-    setInterrupted(false);
-    try {
+    QString problem;
+    QString error;
+    const bool isDone = doAsOnlyJob(error, [&] {
         DialogProgress progress(parent);
-        return exportJob(origin, file, progress, warnings);
-    } catch (const std::bad_alloc &) {
-        return Xlate("There is not enough memory for this input.");
-    }
-}
-
-UReportDoc *launchTemplateJob(const TemplateJob &job, QWidget *parent, QString &error, JobNotes &notes)
-{
-    return launch([&job] { return Expected<JsonSource>(JsonSource::fromObject(job.toJson())); }, parent, error, notes);
+        problem = exportJob(recipe, file, progress, warnings);
+    });
+    return isDone ? problem : error;
 }
 
 } // namespace kareport

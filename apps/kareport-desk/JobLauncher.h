@@ -1,10 +1,14 @@
 #pragma once
 
-#include "Job.h"
 #include "JobExport.h"
 #include "JobNotes.h"
+#include "JobWork.h"
+#include "ReportRecipe.h"
 
 #include <QString>
+#include <QStringList>
+
+#include <functional>
 
 class QWidget;
 class UReportDoc;
@@ -12,19 +16,37 @@ class UReportDoc;
 namespace kareport
 {
 
-/// Whether a job is running now: its report must not be closed.
-bool isJobRunning();
+/// What is asked and told while a report is made.
+struct LaunchHooks
+{
+    /// Is told the files that the report is made of, before they are read; may be empty.
+    std::function<void(const QStringList &files)> aboutToRead = {};
+    /// Of a report that is made again: asked, when all is there, whether it may take the place of what the report holds. May
+    /// be empty.
+    std::function<bool()> mayReplace = {};
+};
 
-/// Runs a job file in the application, with a window that shows progress and can stop it.
-/// @param error  receives what went wrong; empty when the job was stopped
-/// @param notes  receive what the user should know of the report
+/// What became of a job that was run.
+struct LaunchResult
+{
+    QString error;  ///< what went wrong; empty when the job was stopped
+    JobNotes notes; ///< what the user should know of the report
+    QString title;  ///< that the job or the template gives the report
+};
+
+/// Runs a job in the application, with a window that shows progress and can stop it.
 /// @return the report, shown in its pane; null when it was not made
-UReportDoc *launchJob(const QString &path, QWidget *parent, QString &error, JobNotes &notes);
-/// The same with a data file and a template.
-UReportDoc *launchTemplateJob(const TemplateJob &job, QWidget *parent, QString &error, JobNotes &notes);
+UReportDoc *launchJob(const ReportRecipe &recipe, QWidget *parent, LaunchResult &result, const LaunchHooks &hooks = {});
+
+/// Makes a report again, in the same way. Its windows stay, and so do the places in them.
+/// @param result  has the title that the report was made with last
+/// @return false, with the report as it was, when it was not made, or not put into its place; it may have been closed
+///         meanwhile
+bool launchAgain(UReportDoc &report, const ReportRecipe &recipe, QWidget *parent, LaunchResult &result,
+                 const LaunchHooks &hooks = {});
 
 /// Writes the values of a report into a file, as `exportJob` does, with a window that shows progress and can stop it.
 /// @return as `exportJob`
-QString launchExport(const JobOrigin &origin, const QString &file, QWidget *parent, QStringList &warnings);
+QString launchExport(const ReportRecipe &recipe, const QString &file, QWidget *parent, QStringList &warnings);
 
 } // namespace kareport

@@ -1,0 +1,347 @@
+#include "DeskRuns.h"
+
+#include "AppMessageBox.h"
+#include "DeskPreferences.h"
+#include "Folders.h"
+#include "JobLauncher.h"
+#include "JobSaving.h"
+#include "NotesPane.h"
+#include "Profile.h"
+#include "ReportSaveName.h"
+#include "SaveAs.h"
+#include "UApplication.h"
+#include "UReportDoc.h"
+#include "UXTPMDIFrameWnd.h"
+#include "UnitsBar.h"
+#include "Xlate.h"
+
+#include <QApplication>
+#include <QFileInfo>
+#include <QStatusBar>
+#include <QToolButton>
+
+#include <algorithm>
+
+namespace kareport
+{
+
+namespace
+{
+
+const QString followEntry = QStringLiteral("Run When Files Change");
+constexpr int laterTime = 300;     // milliseconds
+constexpr int frontInterval = 200; // milliseconds
+
+} // namespace
+
+DeskRuns::DeskRuns(UXTPMDIFrameWnd &frame)
+    : frame_(frame),
+      watch_([this](const QString &path) { fileChanged(path); }),
+      followsFiles_(GetProfileString(QString(), followEntry) == u"1"),
+      units_(new UnitsBar(&frame)),
+      notes_(new NotesPane(&frame)),
+      count_(new QToolButton)
+{
+    units_->setChosenHandler([this](const QJsonObject &changed) {
+        if (UReportDoc *report = inFront()) {
+            runWith(*report, changed);
+        }
+    });
+    frame.addDockWidget(Qt::BottomDockWidgetArea, notes_);
+    notes_->hide();
+    notes_->setGoHandler([this](int number, bool isInFile) { goToNote(number, isInFile); });
+    count_->setAutoRaise(true);
+    count_->setAccessibleName(Xlate("Number of notes"));
+    count_->hide();
+    connect(count_, &QToolButton::clicked, this, [this] { notes_->open(); });
+    frame.statusBar()->addPermanentWidget(count_);
+    changedTimer_.setSingleShot(true);
+    connect(&changedTimer_, &QTimer::timeout, this, [this] { runChanged(); });
+    connect(&frontTimer_, &QTimer::timeout, this, [this] { showFront(); });
+    frontTimer_.start(frontInterval);
+    askJobFile = [this](const SaveRequest &request) -> std::optional<QString> {
+        const std::optional<SaveChoice> choice = askSavePath(&frame_, request);
+        return choice ? std::optional(choice->path) : std::nullopt;
+    };
+}
+
+DeskRuns::~DeskRuns() = default;
+
+DeskRuns::TextState DeskRuns::stateOf(const UReportDoc &report)
+{
+    return {report.GetEditCount(), report.GetTextLength()};
+}
+
+UReportDoc *DeskRuns::inFront() const
+{
+    return dynamic_cast<UReportDoc *>(frame_.GetCommandDocument());
+}
+
+DeskRuns::Made *DeskRuns::madeOf(const UDocument *report)
+{
+    const auto found = made_.find(report);
+    return found != made_.end() ? &found->second : nullptr;
+}
+
+const DeskRuns::Made *DeskRuns::madeOf(const UDocument *report) const
+{
+    const auto found = made_.find(report);
+    return found != made_.end() ? &found->second : nullptr;
+}
+
+const ReportRecipe *DeskRuns::recipeInFront() const
+{
+    const Made *made = madeOf(frame_.GetCommandDocument());
+    return made != nullptr ? &made->recipe : nullptr;
+}
+
+const JobNotes *DeskRuns::notesOf(const UDocument *report) const
+{
+    const Made *made = madeOf(report);
+    return made != nullptr ? &made->notes : nullptr;
+}
+
+/// Notes how the files of a run are before they are read: what changes from then on is reported.
+LaunchHooks DeskRuns::hooksFor(QStringList &files)
+{
+    LaunchHooks hooks;
+    hooks.aboutToRead = [this, &files](const QStringList &read) {
+        files = read;
+        for (const QString &file : read) {
+            watch_.expect(file);
+        }
+    };
+    return hooks;
+}
+
+void DeskRuns::watch(const QStringList &files)
+{
+    for (const QString &file : files) {
+        watch_.watch(file);
+    }
+    QStringList all;
+    for (const auto &[report, made] : made_) {
+        all += made.files;
+    }
+    watch_.retain(all);
+}
+
+UReportDoc *DeskRuns::run(const ReportRecipe &recipe, QString &error)
+{
+    QStringList files;
+    LaunchResult result;
+    UReportDoc *report = launchJob(recipe, &frame_, result, hooksFor(files));
+    error = result.error;
+    if (report == nullptr) {
+        for (const QString &file : files) {
+            watch_.ceaseToExpect(file);
+        }
+        return nullptr;
+    }
+    made_.insert_or_assign(report, Made{recipe, result.notes, result.title, QString(), stateOf(*report), files});
+    watch(files);
+    ++state_;
+    if (!result.notes.said().empty()) {
+        notes_->show();
+    }
+    return report;
+}
+
+void DeskRuns::forget(const UDocument *report)
+{
+    if (made_.erase(report) > 0) {
+        changed_.erase(report);
+        watch({});
+        ++state_;
+    }
+}
+
+bool DeskRuns::mayReplace(const UReportDoc &report, const TextState &made) const
+{
+    if (stateOf(report) == made) {
+        return true;
+    }
+    const QString question =
+        Xlate("\"%1\" has changes that were made by hand. Make it again and lose them?").arg(report.GetTitle());
+    return showMessage({question, QString(), MessageButtons::YesNo, MessageIcon::Question}) == MessageAnswer::Yes;
+}
+
+bool DeskRuns::runAgain()
+{
+    UReportDoc *report = inFront();
+    return report != nullptr && runAgain(*report, Reason::Asked);
+}
+
+bool DeskRuns::runAgain(UReportDoc &report, Reason reason)
+{
+    Made *made = madeOf(&report);
+    if (made == nullptr) {
+        return false;
+    }
+    if (!isJobRunning() && !mayReplace(report, made->text)) {
+        made = madeOf(&report); // the question was open for as long as it took
+        if (made != nullptr) {
+            made->isKept = reason == Reason::FilesChanged;
+        }
+        return false;
+    }
+    made = madeOf(&report);
+    if (made == nullptr || !UReportDoc::IsReportAvailable(&report)) {
+        return false;
+    }
+    QStringList files;
+    LaunchResult result;
+    result.title = made->title;
+    LaunchHooks hooks = hooksFor(files);
+    // What was changed before has been asked about; what is changed while the job runs has not.
+    hooks.mayReplace = [this, &report, before = stateOf(report)] { return mayReplace(report, before); };
+    made->isOutdated = false; // what changes from now on is another change
+    const ReportRecipe recipe = made->recipe;
+    const bool isMade = launchAgain(report, recipe, &frame_, result, hooks);
+    made = madeOf(&report); // unless it was closed meanwhile
+    if (made != nullptr) {
+        made->isKept = false;
+        made->isOutdated = made->isOutdated || !isMade;
+        made->problem = result.error;
+        if (!files.isEmpty()) {
+            made->files = files;
+        }
+        if (isMade) {
+            made->notes = result.notes;
+            made->title = result.title;
+            made->text = stateOf(report);
+        }
+    }
+    if (made == nullptr) {
+        for (const QString &file : files) {
+            watch_.ceaseToExpect(file);
+        }
+        files.clear();
+    }
+    watch(files);
+    ++state_;
+    if (made != nullptr && !result.error.isEmpty()) {
+        noteFailed(report, result.error, reason);
+    }
+    showFront();
+    return isMade;
+}
+
+void DeskRuns::noteFailed(UReportDoc &report, const QString &error, Reason reason)
+{
+    if (reason == Reason::Asked) {
+        AppMessageBox(error);
+        return;
+    }
+    // A file that is being written is seldom right: nobody has to answer for that.
+    notes_->show();
+    frame_.statusBar()->showMessage(Xlate("\"%1\" was not made again: %2").arg(report.GetTitle(), error));
+}
+
+bool DeskRuns::runWith(UReportDoc &report, const QJsonObject &changed)
+{
+    Made *made = madeOf(&report);
+    if (made == nullptr || changed.isEmpty()) {
+        return false;
+    }
+    const QJsonObject before = made->recipe.settings;
+    for (auto setting = changed.begin(); setting != changed.end(); ++setting) {
+        made->recipe.settings.insert(setting.key(), setting.value());
+    }
+    const bool isMade = runAgain(report, Reason::Asked);
+    made = madeOf(&report);
+    if (!isMade && made != nullptr) {
+        made->recipe.settings = before;
+        ++state_; // the bar shows those before again
+    }
+    showFront();
+    return isMade;
+}
+
+void DeskRuns::setFollowsFiles(bool on)
+{
+    followsFiles_ = on;
+    WriteProfileString(QString(), followEntry, on ? QStringLiteral("1") : QStringLiteral("0"));
+    for (const auto &[report, made] : made_) {
+        if (on && made.isOutdated) {
+            changed_.insert(report);
+            changedTimer_.start(0);
+        }
+    }
+}
+
+void DeskRuns::fileChanged(const QString &path)
+{
+    for (auto &[report, made] : made_) {
+        if (made.files.contains(path)) {
+            made.isOutdated = true;
+            changed_.insert(report);
+            changedTimer_.start(0);
+        }
+    }
+}
+
+/// Makes the reports again whose files have changed, or says that it can be done.
+void DeskRuns::runChanged()
+{
+    if (isJobRunning() || QApplication::activeModalWidget() != nullptr) {
+        changedTimer_.start(laterTime);
+        return;
+    }
+    while (!changed_.empty()) {
+        const UDocument *changed = *changed_.begin();
+        changed_.erase(changed_.begin());
+        const Made *made = madeOf(changed);
+        const std::vector<UDocument *> open = UApplication::Get()->GetDocuments();
+        const auto found = std::find(open.begin(), open.end(), changed);
+        auto *report = found != open.end() ? dynamic_cast<UReportDoc *>(*found) : nullptr;
+        if (made == nullptr || report == nullptr || !made->isOutdated) {
+            continue;
+        }
+        if (followsFiles_ && !made->isKept) {
+            runAgain(*report, Reason::FilesChanged);
+        } else {
+            frame_.statusBar()->showMessage(
+                Xlate("What \"%1\" is made of has changed. F5 makes it again.").arg(report->GetTitle()));
+        }
+    }
+}
+
+void DeskRuns::saveAsJob()
+{
+    const UDocument *report = inFront();
+    const Made *made = madeOf(report);
+    if (made == nullptr) {
+        return;
+    }
+    const ReportRecipe recipe = made->recipe; // the report may be closed while the dialog is open
+    const auto *chosen = std::get_if<TemplateJob>(&recipe.origin);
+    const QFileInfo beside(chosen != nullptr ? chosen->data : recipe.jobFile());
+    SaveRequest request;
+    request.filter = Xlate("Jobs") + QStringLiteral(" (*.json)|*.json||");
+    request.defaultExtension = QStringLiteral("json");
+    request.initialFolder = beside.absoluteDir().exists() ? beside.absolutePath() : GetInitialOpenDir(lastReportFolder);
+    request.fileName = beside.completeBaseName() + QStringLiteral(".json");
+    request.flags = SaveRequest::overwritePrompt | SaveRequest::pathMustExist;
+    const auto file = askJobFile(request);
+    if (!file) {
+        return;
+    }
+    const QString path = QFileInfo(*file).absoluteFilePath();
+    if (const auto wrong = saveJob(recipe, loadPreferences().jobDefaults(), path)) {
+        AppMessageBox(wrong->message());
+        return;
+    }
+    SetLastOpenDir(path, lastReportFolder);
+    UApplication::Get()->AddToRecentFileList(path);
+    if (Made *saved = madeOf(report)) {
+        const QString before = saved->recipe.jobFile();
+        saved->recipe = ReportRecipe(path); // which has the settings of the report
+        saved->files.removeOne(before.isEmpty() ? before : QFileInfo(before).absoluteFilePath());
+        saved->files.prepend(path);
+        watch(QStringList(path));
+    }
+    frame_.statusBar()->showMessage(Xlate("The job was saved as \"%1\".").arg(path));
+}
+
+} // namespace kareport
