@@ -1112,6 +1112,16 @@
         <translation>eine Zahl</translation>
     </message>
     <message>
+        <location filename="../sources/csv/CsvPreview.cpp"/>
+        <source>%1 was expected</source>
+        <translation>%1 wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvPreview.cpp"/>
+        <source>the row has %1 cells: %2 were expected</source>
+        <translation>die Zeile hat %1 Zellen: %2 wurden erwartet</translation>
+    </message>
+    <message>
         <location filename="../sources/csv/CsvReader.cpp"/>
         <source>the file is not UTF-8</source>
         <translation>die Datei ist nicht in UTF-8 kodiert</translation>
@@ -1903,6 +1913,11 @@
         <translation>die Datenbank wurde beim Lesen verändert, von einem Programm, das nicht SQLite verwendet</translation>
     </message>
     <message>
+        <location filename="../sources/sqlite/SqlitePreview.cpp"/>
+        <source>(bytes)</source>
+        <translation>(Bytes)</translation>
+    </message>
+    <message>
         <location filename="../exports/CsvResult.cpp"/>
         <source>%1 texts begin with = or @: a spreadsheet program that opens the file takes them for formulas</source>
         <translation>%1 Texte beginnen mit = oder @: ein Tabellenprogramm, das die Datei öffnet, hält sie für Formeln</translation>
@@ -2206,6 +2221,11 @@
         <location filename="../jobs/JobRunner.cpp"/>
         <source>there is no template file "%1"</source>
         <translation>es gibt keine Vorlagendatei „%1“</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobSaving.cpp"/>
+        <source>the file could not be written: %1</source>
+        <translation>die Datei konnte nicht geschrieben werden: %1</translation>
     </message>
     <message>
         <location filename="../jobs/JobSettings.cpp"/>
@@ -3274,15 +3294,6 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
-        <source>The report was made. Notes on its data: %1
-
-%2</source>
-        <translation>Der Bericht wurde erstellt. Hinweise zu seinen Daten: %1
-
-%2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
         <source>"%1" was opened, but not all of it is shown:
 
 %2</source>
@@ -3547,18 +3558,8 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
-        <source>it is a folder, a pipe or a device</source>
-        <translation>das ist ein Ordner, eine Pipe oder ein Gerät</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
         <source>the report could not be made</source>
         <translation>der Bericht konnte nicht erstellt werden</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
-        <source>Another job is running. Wait until it has finished, or cancel it.</source>
-        <translation>Ein anderer Auftrag läuft gerade. Sein Ende abwarten oder ihn abbrechen.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/KeptReport.cpp"/>
@@ -3892,8 +3893,8 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
-        <source>Data (*.csv *.txt *.xml *.landxml);;All files (*)</source>
-        <translation>Daten (*.csv *.txt *.xml *.landxml);;Alle Dateien (*)</translation>
+        <source>Data (*.csv *.txt *.xml *.landxml *.gpkg *.sqlite *.db);;All files (*)</source>
+        <translation>Daten (*.csv *.txt *.xml *.landxml *.gpkg *.sqlite *.db);;Alle Dateien (*)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
@@ -4191,6 +4192,171 @@ Sollen sie wieder geöffnet werden?</translation>
         <translation>N, E</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>(not read)</source>
+        <translation>(nicht gelesen)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Comma</source>
+        <translation>Komma</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Semicolon</source>
+        <translation>Semikolon</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Tab</source>
+        <translation>Tabulator</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Vertical bar</source>
+        <translation>Senkrechter Strich</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Blanks and tabs</source>
+        <translation>Leerzeichen und Tabulatoren</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Point: 1.5</source>
+        <translation>Punkt: 1.5</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Comma: 1,5</source>
+        <translation>Komma: 1,5</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>First &amp;row names the columns</source>
+        <translation>&amp;Erste Zeile benennt die Spalten</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Tabl&amp;e:</source>
+        <translation>Tab&amp;elle:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Table of the database</source>
+        <translation>Tabelle der Datenbank</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Deli&amp;miter:</source>
+        <translation>Trenn&amp;zeichen:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Delimiter</source>
+        <translation>Trennzeichen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Decimal s&amp;ign:</source>
+        <translation>Dez&amp;imalzeichen:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Decimal sign</source>
+        <translation>Dezimalzeichen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>En&amp;coding:</source>
+        <translation>&amp;Kodierung:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Encoding</source>
+        <translation>Kodierung</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>&amp;Order:</source>
+        <translation>Rei&amp;henfolge:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Order of the columns</source>
+        <translation>Reihenfolge der Spalten</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>&amp;Lengths are:</source>
+        <translation>&amp;Längen sind in:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Unit of lengths in the data</source>
+        <translation>Einheit der Längen in den Daten</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>&amp;Areas are:</source>
+        <translation>Fl&amp;ächen sind in:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Unit of areas in the data</source>
+        <translation>Einheit der Flächen in den Daten</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>A&amp;ngles are:</source>
+        <translation>&amp;Winkel sind in:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Unit of angles in the data</source>
+        <translation>Einheit der Winkel in den Daten</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>First row names the columns</source>
+        <translation>Erste Zeile benennt die Spalten</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>P number, N northing, E easting, Z elevation, D description, - not read</source>
+        <translation>P Nummer, N Hochwert, E Rechtswert, Z Höhe, D Beschreibung, - nicht gelesen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>First rows of the data</source>
+        <translation>Erste Zeilen der Daten</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>the database has no table</source>
+        <translation>die Datenbank hat keine Tabelle</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Database</source>
+        <translation>Datenbank</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Text file</source>
+        <translation>Textdatei</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Line %1, column %2: %3</source>
+        <translation>Zeile %1, Spalte %2: %3</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Variable of the column %1</source>
+        <translation>Variable der Spalte %1</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/main.cpp"/>
         <source>Runs report jobs, and shows, edits and prints reports.</source>
         <translation>Führt Berichtsaufträge aus und zeigt, bearbeitet und druckt Berichte.</translation>
@@ -4199,6 +4365,202 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/main.cpp"/>
         <source>Jobs (.json), saved reports (.rep, .rtf) and templates (.xml) to open</source>
         <translation>Zu öffnende Aufträge (.json), gespeicherte Berichte (.rep, .rtf) und Vorlagen (.xml)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
+        <source>Number of notes</source>
+        <translation>Anzahl der Hinweise</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
+        <source>"%1" has changes that were made by hand. Make it again and lose them?</source>
+        <translation>„%1“ wurde von Hand geändert. Neu erstellen und diese Änderungen verlieren?</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
+        <source>"%1" was not made again: %2</source>
+        <translation>„%1“ wurde nicht neu erstellt: %2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
+        <source>What "%1" is made of has changed. F5 makes it again.</source>
+        <translation>Woraus „%1“ erstellt wurde, hat sich geändert. F5 erstellt es neu.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
+        <source>Jobs</source>
+        <translation>Aufträge</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
+        <source>The job was saved as "%1".</source>
+        <translation>Der Auftrag wurde als „%1“ gespeichert.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
+        <source>Save as &amp;Job...</source>
+        <translation>Als Auf&amp;trag speichern...</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
+        <source>&amp;Run Again	F5</source>
+        <translation>Neu a&amp;usführen	F5</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
+        <source>Run W&amp;hen Files Change</source>
+        <translation>Bei Dateiänderungen aus&amp;führen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
+        <source>U&amp;nits Bar</source>
+        <translation>&amp;Einheitenleiste</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
+        <source>&amp;Choose Units	Ctrl+U</source>
+        <translation>Einheiten &amp;wählen	Ctrl+U</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
+        <source>N&amp;otes</source>
+        <translation>&amp;Hinweise</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
+        <source>&amp;Go to Notes	F8</source>
+        <translation>&amp;Zu den Hinweisen	F8</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
+        <source>Shows what there was to say when the report was made</source>
+        <translation>Zeigt, was beim Erstellen des Berichts zu sagen war</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
+        <source>There is no file with a place for this note.</source>
+        <translation>Zu diesem Hinweis gibt es keine Stelle in einer Datei.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/FilePlace.cpp"/>
+        <source>%1, line %2</source>
+        <translation>%1, Zeile %2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/FilePlace.cpp"/>
+        <source>Lines of the file</source>
+        <translation>Zeilen der Datei</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/JobWork.cpp"/>
+        <source>it is a folder, a pipe or a device</source>
+        <translation>das ist ein Ordner, eine Pipe oder ein Gerät</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/JobWork.cpp"/>
+        <source>Another job is running. Wait until it has finished, or cancel it.</source>
+        <translation>Ein anderer Auftrag läuft gerade. Sein Ende abwarten oder ihn abbrechen.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Unknown column</source>
+        <translation>Unbekannte Spalte</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Field without data</source>
+        <translation>Feld ohne Daten</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Value too wide</source>
+        <translation>Wert zu breit</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Missing value</source>
+        <translation>Fehlender Wert</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>No finite number</source>
+        <translation>Keine endliche Zahl</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Unknown sort key</source>
+        <translation>Unbekannter Sortierschlüssel</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Not in a total</source>
+        <translation>In keiner Summe</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Character not shown</source>
+        <translation>Zeichen nicht dargestellt</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Difference in the data</source>
+        <translation>Widerspruch in den Daten</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Not read</source>
+        <translation>Nicht gelesen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Assumed unit</source>
+        <translation>Angenommene Einheit</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Notes</source>
+        <translation>Hinweise</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Show &amp;Line</source>
+        <translation>&amp;Zeile zeigen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Show Pla&amp;ce in File</source>
+        <translation>&amp;Stelle in der Datei zeigen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Kind</source>
+        <translation>Art</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Text</source>
+        <translation>Text</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Line</source>
+        <comment>of a report</comment>
+        <translation>Zeile</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Place</source>
+        <translation>Stelle</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Not made again</source>
+        <translation>Nicht neu erstellt</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/UnitsBar.cpp"/>
+        <source>Units</source>
+        <translation>Einheiten</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
@@ -4344,11 +4706,6 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
         <source>Remarks on the template</source>
         <translation>Anmerkungen zur Vorlage</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
-        <source>Kind</source>
-        <translation>Art</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>

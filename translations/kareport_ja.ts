@@ -1112,6 +1112,16 @@
         <translation>数値</translation>
     </message>
     <message>
+        <location filename="../sources/csv/CsvPreview.cpp"/>
+        <source>%1 was expected</source>
+        <translation>%1 が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/csv/CsvPreview.cpp"/>
+        <source>the row has %1 cells: %2 were expected</source>
+        <translation>行に %1 個のセルがあります: %2 個が必要です</translation>
+    </message>
+    <message>
         <location filename="../sources/csv/CsvReader.cpp"/>
         <source>the file is not UTF-8</source>
         <translation>ファイルが UTF-8 ではありません</translation>
@@ -1903,6 +1913,11 @@
         <translation>読み取り中に、SQLite を使わないプログラムによってデータベースが変更されました</translation>
     </message>
     <message>
+        <location filename="../sources/sqlite/SqlitePreview.cpp"/>
+        <source>(bytes)</source>
+        <translation>(バイト列)</translation>
+    </message>
+    <message>
         <location filename="../exports/CsvResult.cpp"/>
         <source>%1 texts begin with = or @: a spreadsheet program that opens the file takes them for formulas</source>
         <translation>%1 個のテキストが = または @ で始まります。ファイルを開く表計算プログラムはこれを数式とみなします</translation>
@@ -2206,6 +2221,11 @@
         <location filename="../jobs/JobRunner.cpp"/>
         <source>there is no template file "%1"</source>
         <translation>テンプレートファイル「%1」がありません</translation>
+    </message>
+    <message>
+        <location filename="../jobs/JobSaving.cpp"/>
+        <source>the file could not be written: %1</source>
+        <translation>ファイルに書き込めませんでした: %1</translation>
     </message>
     <message>
         <location filename="../jobs/JobSettings.cpp"/>
@@ -3274,15 +3294,6 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
-        <source>The report was made. Notes on its data: %1
-
-%2</source>
-        <translation>レポートを作成しました。データに関する注意: %1
-
-%2</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
         <source>"%1" was opened, but not all of it is shown:
 
 %2</source>
@@ -3547,18 +3558,8 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
-        <source>it is a folder, a pipe or a device</source>
-        <translation>フォルダー、パイプ、またはデバイスです</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
         <source>the report could not be made</source>
         <translation>帳票を作成できませんでした</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/JobLauncher.cpp"/>
-        <source>Another job is running. Wait until it has finished, or cancel it.</source>
-        <translation>別のジョブが実行中です。終了を待つか、中止してください。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/KeptReport.cpp"/>
@@ -3892,8 +3893,8 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
-        <source>Data (*.csv *.txt *.xml *.landxml);;All files (*)</source>
-        <translation>データ (*.csv *.txt *.xml *.landxml);;すべてのファイル (*)</translation>
+        <source>Data (*.csv *.txt *.xml *.landxml *.gpkg *.sqlite *.db);;All files (*)</source>
+        <translation>データ (*.csv *.txt *.xml *.landxml *.gpkg *.sqlite *.db);;すべてのファイル (*)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
@@ -4191,6 +4192,171 @@ Open them again?</source>
         <translation>N, E</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>(not read)</source>
+        <translation>(読み込まない)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Comma</source>
+        <translation>コンマ</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Semicolon</source>
+        <translation>セミコロン</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Tab</source>
+        <translation>タブ</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Vertical bar</source>
+        <translation>縦線</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Blanks and tabs</source>
+        <translation>空白とタブ</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Point: 1.5</source>
+        <translation>ピリオド: 1.5</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Comma: 1,5</source>
+        <translation>コンマ: 1,5</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>First &amp;row names the columns</source>
+        <translation>先頭行は列名(&amp;R)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Tabl&amp;e:</source>
+        <translation>テーブル(&amp;E):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Table of the database</source>
+        <translation>データベースのテーブル</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Deli&amp;miter:</source>
+        <translation>区切り文字(&amp;M):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Delimiter</source>
+        <translation>区切り文字</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Decimal s&amp;ign:</source>
+        <translation>小数点(&amp;I):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Decimal sign</source>
+        <translation>小数点</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>En&amp;coding:</source>
+        <translation>文字コード(&amp;C):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Encoding</source>
+        <translation>文字コード</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>&amp;Order:</source>
+        <translation>順序(&amp;O):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Order of the columns</source>
+        <translation>列の順序</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>&amp;Lengths are:</source>
+        <translation>長さの単位(&amp;L):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Unit of lengths in the data</source>
+        <translation>データの長さの単位</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>&amp;Areas are:</source>
+        <translation>面積の単位(&amp;A):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Unit of areas in the data</source>
+        <translation>データの面積の単位</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>A&amp;ngles are:</source>
+        <translation>角度の単位(&amp;N):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Unit of angles in the data</source>
+        <translation>データの角度の単位</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>First row names the columns</source>
+        <translation>先頭行は列名</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>P number, N northing, E easting, Z elevation, D description, - not read</source>
+        <translation>P 番号、N 北座標、E 東座標、Z 標高、D 説明、- 読み込まない</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>First rows of the data</source>
+        <translation>データの先頭の行</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>the database has no table</source>
+        <translation>データベースにテーブルがありません</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Database</source>
+        <translation>データベース</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Text file</source>
+        <translation>テキストファイル</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Line %1, column %2: %3</source>
+        <translation>%1 行 %2 列: %3</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>Variable of the column %1</source>
+        <translation>列 %1 の変数</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/main.cpp"/>
         <source>Runs report jobs, and shows, edits and prints reports.</source>
         <translation>帳票ジョブを実行し、帳票を表示、編集、印刷します。</translation>
@@ -4199,6 +4365,202 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/main.cpp"/>
         <source>Jobs (.json), saved reports (.rep, .rtf) and templates (.xml) to open</source>
         <translation>開くジョブ (.json)、保存した帳票 (.rep, .rtf)、テンプレート (.xml)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
+        <source>Number of notes</source>
+        <translation>注意の数</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
+        <source>"%1" has changes that were made by hand. Make it again and lose them?</source>
+        <translation>「%1」には手作業による変更があります。変更を破棄して作成し直しますか?</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
+        <source>"%1" was not made again: %2</source>
+        <translation>「%1」は作成し直されませんでした: %2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
+        <source>What "%1" is made of has changed. F5 makes it again.</source>
+        <translation>「%1」の元のファイルが変更されました。F5 で作成し直します。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
+        <source>Jobs</source>
+        <translation>ジョブ</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
+        <source>The job was saved as "%1".</source>
+        <translation>ジョブを「%1」として保存しました。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
+        <source>Save as &amp;Job...</source>
+        <translation>ジョブとして保存(&amp;J)...</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
+        <source>&amp;Run Again	F5</source>
+        <translation>再実行(&amp;R)	F5</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
+        <source>Run W&amp;hen Files Change</source>
+        <translation>ファイルの変更時に実行(&amp;H)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
+        <source>U&amp;nits Bar</source>
+        <translation>単位バー(&amp;N)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
+        <source>&amp;Choose Units	Ctrl+U</source>
+        <translation>単位を選択(&amp;C)	Ctrl+U</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
+        <source>N&amp;otes</source>
+        <translation>注意(&amp;O)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
+        <source>&amp;Go to Notes	F8</source>
+        <translation>注意へ移動(&amp;G)	F8</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
+        <source>Shows what there was to say when the report was made</source>
+        <translation>レポートの作成時の注意を表示します</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
+        <source>There is no file with a place for this note.</source>
+        <translation>この注意に対応するファイルの位置はありません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/FilePlace.cpp"/>
+        <source>%1, line %2</source>
+        <translation>%1、%2 行</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/FilePlace.cpp"/>
+        <source>Lines of the file</source>
+        <translation>ファイルの行</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/JobWork.cpp"/>
+        <source>it is a folder, a pipe or a device</source>
+        <translation>フォルダー、パイプ、またはデバイスです</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/JobWork.cpp"/>
+        <source>Another job is running. Wait until it has finished, or cancel it.</source>
+        <translation>別のジョブが実行中です。終了を待つか、中止してください。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Unknown column</source>
+        <translation>不明な列</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Field without data</source>
+        <translation>データのないフィールド</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Value too wide</source>
+        <translation>幅を超える値</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Missing value</source>
+        <translation>欠けている値</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>No finite number</source>
+        <translation>有限でない数値</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Unknown sort key</source>
+        <translation>不明な並べ替えキー</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Not in a total</source>
+        <translation>合計に含まれない値</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Character not shown</source>
+        <translation>表示されない文字</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Difference in the data</source>
+        <translation>データの不一致</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Not read</source>
+        <translation>読み込まれないもの</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Assumed unit</source>
+        <translation>仮定された単位</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Notes</source>
+        <translation>注意</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Show &amp;Line</source>
+        <translation>行を表示(&amp;L)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Show Pla&amp;ce in File</source>
+        <translation>ファイルの位置を表示(&amp;C)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Kind</source>
+        <translation>種類</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Text</source>
+        <translation>内容</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Line</source>
+        <comment>of a report</comment>
+        <translation>行</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Place</source>
+        <translation>位置</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>
+        <source>Not made again</source>
+        <translation>再作成に失敗</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/UnitsBar.cpp"/>
+        <source>Units</source>
+        <translation>単位</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
@@ -4344,11 +4706,6 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
         <source>Remarks on the template</source>
         <translation>テンプレートへの指摘</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
-        <source>Kind</source>
-        <translation>種類</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>

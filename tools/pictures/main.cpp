@@ -2,7 +2,10 @@
 #include "DeskApplication.h"
 #include "DeskCommandIds.h"
 #include "DeskFrame.h"
+#include "FilePlace.h"
 #include "FindBar.h"
+#include "ImportPanel.h"
+#include "NotesPane.h"
 #include "OpenTemplate.h"
 #include "PageBar.h"
 #include "PageDefaults.h"
@@ -28,12 +31,16 @@
 #include <QCommandLineParser>
 #include <QDir>
 #include <QEventLoop>
+#include <QFile>
+#include <QFileInfo>
 #include <QLineEdit>
 #include <QMenu>
 #include <QMenuBar>
 #include <QScrollBar>
 #include <QStyleFactory>
 #include <QTabWidget>
+#include <QTableWidget>
+#include <QTemporaryDir>
 #include <QTimer>
 #include <QToolBar>
 
@@ -177,6 +184,60 @@ void takeTemplateEditor(Pictures &pictures, const QString &examples)
     window.close();
 }
 
+bool put(const QString &path, const QByteArray &content)
+{
+    QFile file(path);
+    return file.open(QIODevice::WriteOnly) && file.write(content) == content.size();
+}
+
+/// A report that there is something to say of, and data some of which does not fit.
+void takeNotes(Pictures &pictures, const QString &examples)
+{
+    const QTemporaryDir folder;
+    const QString data = folder.filePath(QStringLiteral("points.csv"));
+    const QString job = folder.filePath(QStringLiteral("points.json"));
+    const QString survey = QFileInfo(QDir(examples).filePath(QStringLiteral("survey.xml"))).absoluteFilePath();
+    put(data, "Number,Northing,Easting,Elev,Description\n"
+              "101,5000123.250,400012.5,100.25,nail in kerb\n"
+              "102,5000124.750,123456789012345.5,100.5,a description that is much too long for its column\n"
+              "103,,400014.5,100.75,bolt\n");
+    put(job, R"({"title": "Control points", "template": {"file": ")" + survey.toUtf8() + R"(", "name": "CONTROL"},
+        "data": {"p": {"csv": "points.csv"}}, "report": [{"table": "Points", "data": "p"}]})");
+    DeskApplication application;
+    DeskFrame frame;
+    frame.OpenFile(job);
+    auto *report = dynamic_cast<UReportDoc *>(application.GetCurrentReport());
+    auto *window = report != nullptr ? dynamic_cast<UReportWindowDlg *>(report->GetReportWindow()) : nullptr;
+    if (window != nullptr && window->isCreated()) {
+        window->ShowReport();
+    }
+    frame.runs().showFront();
+    frame.runs().notesPane().open();
+    pictures.take(frame, "desk-notes");
+    kareport::showFilePlace(&frame, data, {3, 16});
+    if (auto *place = frame.findChild<QDialog *>()) {
+        pictures.take(*place, "file-place");
+        place->close();
+    }
+    for (UDocument *document : application.GetDocTemplates().front()->GetDocuments()) {
+        document->SetModifiedFlag(false);
+    }
+    put(data, "Pt;North;East;Height;Remark\n101;5000123,250;400012,5;100,25;nail in kerb\n"
+              "102;5000124,750;four;100,5;bolt\n103;5000125,5;400014,5;100,75;bolt\n");
+    kareport::TemplateDialog fromTemplate;
+    fromTemplate.setTemplateFile(survey);
+    fromTemplate.setData(data);
+    const QStringList variables = {QStringLiteral("Number"), QStringLiteral("Northing"), QStringLiteral("Easting"),
+                                   QStringLiteral("Elevation")};
+    auto *import = fromTemplate.findChild<kareport::ImportPanel *>();
+    for (int column = 0; column < import->table().columnCount() && column < variables.size(); ++column) {
+        if (auto *box = qobject_cast<QComboBox *>(import->table().cellWidget(0, column))) {
+            box->setCurrentIndex(box->findData(variables[column]));
+        }
+    }
+    pictures.take(fromTemplate, "template-cells");
+}
+
 void takeDialogs(Pictures &pictures, const QString &examples)
 {
     kareport::PreferencesDialog preferences(kareport::loadPreferences());
@@ -240,6 +301,7 @@ int main(int argc, char **argv)
     Pictures pictures(folder, parser.value(suffix));
     takeDesk(pictures, parser.value(examples));
     takeTemplateEditor(pictures, parser.value(examples));
+    takeNotes(pictures, parser.value(examples));
     takeDialogs(pictures, parser.value(examples));
     return pictures.isWritten() ? 0 : 1;
 }
