@@ -65,6 +65,9 @@ bool guessByVariables(const std::shared_ptr<const FileBytes> &text, const Variab
         if (const auto *found = std::get_if<CsvDialect>(&guessed)) {
             CsvRows rows(text, *found, variables);
             rows.checkHeader();
+            UDataObject object; // where no reading fits, what was found says what is wrong with one
+            for (int row = 0; row < mostRows && !rows.error() && rows.next(object, nullptr); ++row) {
+            }
             if (!rows.error()) {
                 dialect = *found;
                 return true;

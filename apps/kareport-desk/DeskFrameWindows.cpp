@@ -162,8 +162,9 @@ void DeskFrame::saveLayout()
     // The panes go with the reports. Qt keeps places for panes that are not there at the next start, and the window of a row
     // of tabs without tabs, and fails when others are dragged into them.
     for (QDockWidget *dock : findChildren<QDockWidget *>()) {
-        if (dynamic_cast<kareport::PaneDock *>(dock) != nullptr) {
-            dock->setParent(nullptr);
+        dock->setParent(nullptr);
+        if (dynamic_cast<kareport::PaneDock *>(dock) == nullptr) {
+            dock->deleteLater(); // no pane owns it
         }
     }
     for (QWidget *window : findChildren<QWidget *>(QString(), Qt::FindDirectChildrenOnly)) {

@@ -155,7 +155,7 @@ TEST_F(Imports, ChoicesReachTheJob)
     EXPECT_EQ(
         optionsOf(dialog),
         "{\"delimiter\":\"|\",\"header\":false,\"order\":\"PEN\",\"units\":{\"angle\":\"gon\",\"length\":\"usft\"}}");
-    EXPECT_EQ(chosen(dialog, "Variable of the column 2"), QStringLiteral("Easting"));
+    EXPECT_EQ(chosen(dialog, "Variable of the column Easting"), QStringLiteral("Easting"));
     order->clear();
     EXPECT_FALSE(message(dialog).isEmpty()) << "no column is a variable";
     press(dialog, "Variable of the column 3", "Northing");

@@ -127,6 +127,10 @@ TEST(UnitsBar, TheKeyboardComesAndGoes)
     EXPECT_TRUE(bar.isVisible());
     auto *box = boxNamed<QComboBox>(bar, "Unit of lengths");
     EXPECT_TRUE(box->hasFocus());
+    QTest::keyClick(box, Qt::Key_Tab);
+    EXPECT_TRUE(boxNamed<QSpinBox>(bar, "Decimals of lengths")->hasFocus()) << "from box to box";
+    QTest::keyClick(QApplication::focusWidget(), Qt::Key_Backtab);
+    EXPECT_TRUE(box->hasFocus());
     QTest::keyClick(box, Qt::Key_Escape);
     EXPECT_TRUE(edit.hasFocus());
 }

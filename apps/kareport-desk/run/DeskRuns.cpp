@@ -38,22 +38,12 @@ DeskRuns::DeskRuns(UXTPMDIFrameWnd &frame)
     : frame_(frame),
       watch_([this](const QString &path) { fileChanged(path); }),
       followsFiles_(GetProfileString(QString(), followEntry) == u"1"),
-      units_(new UnitsBar(&frame)),
-      notes_(new NotesPane(&frame)),
       count_(new QToolButton)
 {
-    units_->setChosenHandler([this](const QJsonObject &changed) {
-        if (UReportDoc *report = inFront()) {
-            runWith(*report, changed);
-        }
-    });
-    frame.addDockWidget(Qt::BottomDockWidgetArea, notes_);
-    notes_->hide();
-    notes_->setGoHandler([this](int number, bool isInFile) { goToNote(number, isInFile); });
     count_->setAutoRaise(true);
     count_->setAccessibleName(Xlate("Number of notes"));
     count_->hide();
-    connect(count_, &QToolButton::clicked, this, [this] { notes_->open(); });
+    connect(count_, &QToolButton::clicked, this, [this] { notesPane().open(); });
     frame.statusBar()->addPermanentWidget(count_);
     changedTimer_.setSingleShot(true);
     connect(&changedTimer_, &QTimer::timeout, this, [this] { runChanged(); });
@@ -142,7 +132,7 @@ UReportDoc *DeskRuns::run(const ReportRecipe &recipe, QString &error)
     watch(files);
     ++state_;
     if (!result.notes.said().empty()) {
-        notes_->show();
+        notesPane().show();
     }
     return report;
 }
@@ -234,7 +224,7 @@ void DeskRuns::noteFailed(UReportDoc &report, const QString &error, Reason reaso
         return;
     }
     // A file that is being written is seldom right: nobody has to answer for that.
-    notes_->show();
+    notesPane().show();
     frame_.statusBar()->showMessage(Xlate("\"%1\" was not made again: %2").arg(report.GetTitle(), error));
 }
 

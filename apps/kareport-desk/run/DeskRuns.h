@@ -7,6 +7,7 @@
 #include "SaveDialog.h"
 
 #include <QObject>
+#include <QPointer>
 #include <QStringList>
 #include <QTimer>
 
@@ -70,7 +71,8 @@ public:
     /// Brings bar, pane and status bar up to date with the report in front.
     void showFront();
 
-    NotesPane &notesPane() const { return *notes_; }
+    /// The pane of notes, which is made when it is needed.
+    NotesPane &notesPane();
     UnitsBar &unitsBar() const { return *units_; }
 
     /// Asks for the name of a job file; a test answers instead.
@@ -108,6 +110,7 @@ private:
     void noteFailed(UReportDoc &report, const QString &error, Reason reason);
     void fileChanged(const QString &path);
     void runChanged();
+    void showNotes();
     void showCount();
     void goToNote(int number, bool isInFile);
     void goToLine(UReportDoc &report, qint64 line);
@@ -119,8 +122,8 @@ private:
     std::set<const UDocument *> changed_; ///< reports whose files have changed and that are not looked at yet
     QTimer changedTimer_;
     QTimer frontTimer_;
-    UnitsBar *units_; ///< the frame's, as are the others
-    NotesPane *notes_;
+    UnitsBar *units_ = nullptr; ///< the frame's, as are the others
+    QPointer<NotesPane> notes_; ///< null until it is needed
     QToolButton *count_;
     const UDocument *shown_ = nullptr; ///< the report that they are about
     quint64 shownState_ = 0;

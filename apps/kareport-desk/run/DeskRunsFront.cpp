@@ -16,6 +16,8 @@
 #include <QStatusBar>
 #include <QToolButton>
 
+#include <iterator>
+
 namespace kareport
 {
 
@@ -30,9 +32,9 @@ std::vector<Command> DeskRuns::commands()
         {viewUnitsBarCommand, [this] { units_->setVisible(!units_->isVisible()); },
          [this](CommandState &state) { state.checked = units_->isVisible(); }},
         {chooseUnitsCommand, [this] { units_->takeFocus(); }, isMade},
-        {viewNotesCommand, [this] { notes_->setVisible(!notes_->isVisible()); },
-         [this](CommandState &state) { state.checked = notes_->isVisible(); }},
-        {goToNotesCommand, [this] { notes_->open(); }, {}},
+        {viewNotesCommand, [this] { notesPane().setVisible(!notesPane().isVisible()); },
+         [this](CommandState &state) { state.checked = !notes_.isNull() && notes_->isVisible(); }},
+        {goToNotesCommand, [this] { notesPane().open(); }, {}},
     };
 }
 
@@ -46,12 +48,30 @@ void DeskRuns::addTo(const ReportMenu &menu)
     insert(*menu.file, updateTextCommand, saveAsJobCommand, Xlate("Save as &Job..."));
     insert(*menu.file, updateTextCommand, runAgainCommand, Xlate("&Run Again\tF5"));
     insert(*menu.file, updateTextCommand, runWhenChangedCommand, Xlate("Run W&hen Files Change"))->setCheckable(true);
+    units_ = new UnitsBar(&frame_);
+    units_->setChosenHandler([this](const QJsonObject &changed) {
+        if (UReportDoc *report = inFront()) {
+            runWith(*report, changed);
+        }
+    });
     frame_.addToolBarBreak();
     frame_.addToolBar(units_);
     frame_.AddCommand(*menu.view, viewUnitsBarCommand, Xlate("U&nits Bar"))->setCheckable(true);
     frame_.AddCommand(*menu.view, chooseUnitsCommand, Xlate("&Choose Units\tCtrl+U"));
     frame_.AddCommand(*menu.view, viewNotesCommand, Xlate("N&otes"))->setCheckable(true);
     frame_.AddCommand(*menu.view, goToNotesCommand, Xlate("&Go to Notes\tF8"));
+}
+
+NotesPane &DeskRuns::notesPane()
+{
+    if (notes_.isNull()) {
+        notes_ = new NotesPane(&frame_);
+        notes_->setGoHandler([this](int number, bool isInFile) { goToNote(number, isInFile); });
+        frame_.addDockWidget(Qt::BottomDockWidgetArea, notes_);
+        notes_->hide();
+        showNotes();
+    }
+    return *notes_;
 }
 
 void DeskRuns::showFront()
@@ -65,14 +85,24 @@ void DeskRuns::showFront()
     shown_ = front;
     shownState_ = state_;
     units_->showSettings(made != nullptr ? std::optional(report->GetJobSettings()) : std::nullopt);
-    notes_->showNotes(made != nullptr ? made->notes.said() : std::vector<JobNote>(),
-                      made != nullptr ? made->problem : QString());
+    showNotes();
     showCount();
+}
+
+void DeskRuns::showNotes()
+{
+    const Made *made = madeOf(shown_);
+    if (!notes_.isNull()) {
+        notes_->showNotes(made != nullptr ? made->notes.said() : std::vector<JobNote>(),
+                          made != nullptr ? made->problem : QString());
+    }
 }
 
 void DeskRuns::showCount()
 {
-    const int count = notes_->count();
+    const Made *made = madeOf(shown_);
+    const qsizetype count =
+        made != nullptr ? std::ssize(made->notes.said()) + (made->problem.isEmpty() ? 0 : 1) : qsizetype(0);
     count_->setVisible(count > 0);
     count_->setText(count == 1 ? Xlate("1 note") : Xlate("%1 notes").arg(count));
     count_->setToolTip(Xlate("Shows what there was to say when the report was made"));

@@ -10,6 +10,7 @@
 #include <QSignalBlocker>
 #include <QSpinBox>
 
+#include <algorithm>
 #include <initializer_list>
 #include <utility>
 
@@ -108,7 +109,10 @@ Widget *UnitsBar::add(Widget *widget, const QString &name)
 {
     widget->setAccessibleName(name);
     widget->setToolTip(name);
-    widget->setFocusPolicy(Qt::StrongFocus); // the wheel chooses nothing on its way over the bar
+    // As the other bars, it is not on the way of the Tab key through the reports; within it, that goes from box to box. The
+    // wheel chooses nothing on its way over the bar.
+    widget->setFocusPolicy(Qt::ClickFocus);
+    boxes_.push_back(widget);
     widget->installEventFilter(this);
     addWidget(widget);
     return widget;
@@ -167,11 +171,27 @@ void UnitsBar::takeFocus()
     lengthUnit_->setFocus(Qt::ShortcutFocusReason);
 }
 
-bool UnitsBar::eventFilter(QObject *watched, QEvent *event)
+/// @return whether it uses the key up
+bool UnitsBar::pressKey(int key, const QObject *box)
 {
-    if (event->type() == QEvent::KeyPress && static_cast<QKeyEvent *>(event)->key() == Qt::Key_Escape && before_) {
+    const auto at = std::find(boxes_.begin(), boxes_.end(), box);
+    if (key == Qt::Key_Escape && before_) {
         before_->setFocus(Qt::OtherFocusReason);
         before_.clear();
+        return true;
+    }
+    if ((key == Qt::Key_Tab || key == Qt::Key_Backtab) && at != boxes_.end()) {
+        const std::size_t number = static_cast<std::size_t>(at - boxes_.begin());
+        const std::size_t step = key == Qt::Key_Tab ? 1 : boxes_.size() - 1;
+        boxes_[(number + step) % boxes_.size()]->setFocus(Qt::TabFocusReason);
+        return true;
+    }
+    return false;
+}
+
+bool UnitsBar::eventFilter(QObject *watched, QEvent *event)
+{
+    if (event->type() == QEvent::KeyPress && pressKey(static_cast<QKeyEvent *>(event)->key(), watched)) {
         return true;
     }
     if (event->type() == QEvent::Wheel && !static_cast<QWidget *>(watched)->hasFocus()) {

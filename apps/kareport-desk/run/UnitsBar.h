@@ -8,6 +8,7 @@
 
 #include <functional>
 #include <optional>
+#include <vector>
 
 class QComboBox;
 class QSpinBox;
@@ -36,6 +37,7 @@ private:
     Widget *add(Widget *widget, const QString &name);
     UJobSettings chosenSettings() const;
     void noteChosen();
+    bool pressKey(int key, const QObject *box);
 
     UJobSettings settings_; ///< that are shown, with those that the bar does not show
     QComboBox *lengthUnit_;
@@ -46,7 +48,8 @@ private:
     QComboBox *stationFormat_;
     QSpinBox *stationDecimals_;
     QComboBox *northEastOrder_;
-    QPointer<QWidget> before_; ///< had the keyboard before the bar took it
+    std::vector<QWidget *> boxes_; ///< in their order
+    QPointer<QWidget> before_;     ///< had the keyboard before the bar took it
     std::function<void(const QJsonObject &)> chosen_;
 };
 
