@@ -4,6 +4,9 @@
 #include "DeskCommandIds.h"
 #include "FilePlace.h"
 #include "NotesPane.h"
+#include "OpenTemplate.h"
+#include "TemplateTextEdit.h"
+#include "TemplateWindow.h"
 
 #include <QDialog>
 #include <QLabel>
@@ -127,6 +130,30 @@ TEST(NotesPane, ANoteOnAValueHasBothPlaces)
     ASSERT_NE(desk.filePlace(), nullptr);
     const auto *text = desk.filePlace()->findChild<QPlainTextEdit *>();
     EXPECT_EQ(text->textCursor().block().text(), QStringLiteral(" 91  90,123456789.5,1"));
+}
+
+TEST(NotesPane, APlaceInATemplateOpensItsEditor)
+{
+    TableDesk desk;
+    QByteArray text = desk.folder.bytesOf("t.xml");
+    desk.folder.put("t.xml", text.replace("<Field><VariableName>North<", "\n<Field><VariableName>Norht<"));
+    UReportDoc *report = desk.open();
+    ASSERT_NE(report, nullptr);
+    desk.frame->runs().showFront();
+    QTreeWidget &list = desk.frame->runs().notesPane().list();
+    QTreeWidgetItem *field = list.findItems(QStringLiteral("Field without data"), Qt::MatchExactly).value(0);
+    ASSERT_NE(field, nullptr);
+    EXPECT_TRUE(field->text(3).startsWith(QStringLiteral("t.xml:2:"))) << field->text(3).toStdString();
+    list.setCurrentItem(field);
+    QTest::keyClick(&list, Qt::Key_Return);
+    kareport::TemplateWindow *editor = nullptr;
+    for (QWidget *window : QApplication::topLevelWidgets()) {
+        auto *found = dynamic_cast<kareport::TemplateWindow *>(window);
+        editor = found != nullptr && window->isVisible() ? found : editor;
+    }
+    ASSERT_NE(editor, nullptr);
+    EXPECT_EQ(editor->edit().textCursor().blockNumber(), 1);
+    kareport::dropTemplateEditors();
 }
 
 TEST(NotesPane, ShowsTheNotesOfTheReportInFront)

@@ -1,5 +1,8 @@
 #include "FilePlace.h"
 
+#include "FileKind.h"
+#include "LandXmlContents.h"
+#include "OpenTemplate.h"
 #include "PlainWidgets.h"
 #include "Xlate.h"
 
@@ -26,6 +29,14 @@ constexpr qsizetype linesAfter = 500;
 constexpr qsizetype longestShown = 10'000; ///< bytes of a line
 
 const QString filePlaceName = QStringLiteral("filePlace");
+
+/// Whether a file is a template, and no data of that ending.
+bool isTemplate(const QString &path)
+{
+    const auto file = fileKindOf(path) == FileKind::Template ? FileBytes::open(path) : InputError();
+    const auto *opened = std::get_if<std::shared_ptr<const FileBytes>>(&file);
+    return opened != nullptr && !isLandXml(*opened);
+}
 
 /// A window of lines with their numbers, of which one is marked.
 class FilePlaceDialog : public QDialog
@@ -116,6 +127,9 @@ bool showFilePlace(QWidget *parent, const QString &path, const TextPlace &place)
     FileLines read;
     if (!readLinesAround(path, place.line, read)) {
         return false;
+    }
+    if (isTemplate(path)) {
+        return openTemplateAt(path, place.line, place.column);
     }
     // The one before gives way: a double click asks twice.
     for (QDialog *before : parent->findChildren<QDialog *>(filePlaceName)) {
