@@ -64,7 +64,7 @@ TEST(UnitsBar, AChoiceMakesTheReportAgain)
     desk.frame->runs().showFront();
     EXPECT_EQ(boxNamed<QComboBox>(bar, "Unit of lengths")->currentText(), QStringLiteral("ft"));
     ASSERT_TRUE(desk.frame->runs().runAgain());
-    EXPECT_EQ(TableDesk::northings(*report).front(), QStringLiteral("1.000")) << "also when it is made again";
+    EXPECT_EQ(TableDesk::northings(*report).front(), QStringLiteral("1.00")) << "also when it is made again";
 }
 
 TEST(UnitsBar, EveryChoiceReachesTheJob)

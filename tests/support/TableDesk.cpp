@@ -3,6 +3,7 @@
 #include "UReportWindowDlg.h"
 
 #include <QAction>
+#include <QRegularExpression>
 
 TableDesk::TableDesk()
 {
@@ -56,15 +57,11 @@ UReportView *TableDesk::viewOf(const UReportDoc &report)
 
 QStringList TableDesk::northings(const UReportDoc &report)
 {
+    static const QRegularExpression row(QStringLiteral("^\\s*[0-9]+[^0-9.]+(-?[0-9]+\\.[0-9]+)\\s*$"));
     QStringList found;
     for (const QString &line : textOf(report).split(u'\n')) {
-        const QStringList words = line.split(u' ', Qt::SkipEmptyParts);
-        bool isRow = false;
-        if (words.size() == 2) {
-            words[0].toInt(&isRow);
-        }
-        if (isRow) {
-            found.append(words[1]);
+        if (const QRegularExpressionMatch match = row.match(line); match.hasMatch()) {
+            found.append(match.captured(1));
         }
     }
     return found;
