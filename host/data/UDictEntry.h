@@ -16,6 +16,8 @@ public:
     /// The kinds of values, in the order of their numbers.
     using Value = std::variant<bool, qint16, qint32, double, QString, UPointNumber>;
 
+    /// An entry that is false until it gets a value.
+    explicit UDictEntry(unsigned id) : id_(id) {}
     /// A value under an identifier.
     UDictEntry(unsigned id, Value value) : id_(id), value_(std::move(value)) {}
 

@@ -28,7 +28,7 @@ UDictEntry::Value &UDictionary::valueOf(unsigned id)
 {
     auto place = entries_.begin() + (lowerBound(id) - entries_.cbegin());
     if (place == entries_.end() || place->GetId() != id) {
-        place = entries_.emplace(place, id, UDictEntry::Value());
+        place = entries_.emplace(place, id);
     }
     return place->value();
 }
