@@ -32,6 +32,14 @@ install(FILES ${completion}/kareport.zsh RENAME _kareport COMPONENT programs
         DESTINATION "${CMAKE_INSTALL_DATADIR}/zsh/\${ka_zsh_folder}")
 install(FILES packaging/kareport-desk.desktop DESTINATION ${CMAKE_INSTALL_DATADIR}/applications COMPONENT programs)
 install(FILES packaging/kareport.svg DESTINATION ${CMAKE_INSTALL_DATADIR}/icons/hicolor/scalable/apps COMPONENT programs)
+foreach(size 16 22 24 32 48 64 128 256 512)
+    install(FILES packaging/icons/${size}x${size}/kareport.png COMPONENT programs
+            DESTINATION ${CMAKE_INSTALL_DATADIR}/icons/hicolor/${size}x${size}/apps)
+endforeach()
+# The examples that the desktop program offers, which run where they are.
+file(GLOB example_files CONFIGURE_DEPENDS ${PROJECT_SOURCE_DIR}/examples/*.json ${PROJECT_SOURCE_DIR}/examples/*.xml)
+install(FILES ${example_files} examples/README.md DESTINATION ${CMAKE_INSTALL_DATADIR}/kareport/examples COMPONENT programs)
+install(DIRECTORY examples/data DESTINATION ${CMAKE_INSTALL_DATADIR}/kareport/examples COMPONENT programs)
 install(FILES packaging/kareport.xml DESTINATION ${CMAKE_INSTALL_DATADIR}/mime/packages COMPONENT programs)
 
 set(config_dir ${CMAKE_INSTALL_LIBDIR}/cmake/KaReport)

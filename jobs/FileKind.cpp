@@ -6,6 +6,9 @@
 #include <QFile>
 #include <QFileInfo>
 
+#include <algorithm>
+#include <iterator>
+
 namespace kareport
 {
 
@@ -47,6 +50,13 @@ std::optional<FileKind> fileKindOf(QStringView name)
         }
     }
     return std::nullopt;
+}
+
+bool isDataName(QStringView name)
+{
+    constexpr QStringView dataEndings[] = {u".csv", u".tsv", u".pts", u".jsonl", u".gpkg", u".sqlite", u".db"};
+    return std::any_of(std::begin(dataEndings), std::end(dataEndings),
+                       [name](QStringView ending) { return hasEnding(name, ending); });
 }
 
 bool isJobFile(const QString &file)

@@ -24,6 +24,9 @@ bool hasEnding(QStringView name, QStringView ending);
 /// The kind that the ending of a file name says; nothing where it says none, as that of a report file.
 std::optional<FileKind> fileKindOf(QStringView name);
 
+/// Whether a file is data that a report can be made of, by its name. LandXML is not told from a template so.
+bool isDataName(QStringView name);
+
 /// Whether a file is a job. Standard input, "-", is one. A file whose name does not tell is opened: a job begins with a
 /// brace.
 bool isJobFile(const QString &file);

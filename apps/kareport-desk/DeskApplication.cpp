@@ -80,7 +80,11 @@ void installDialogs(QWidget *parent)
     };
     setPrintDialogs(printing);
     setSaveDialog([parent](const SaveRequest &request) {
-        return askOwnName(request, [parent](const SaveRequest &asked) { return askSavePath(parent, asked); });
+        return askOwnName(request, [parent](const SaveRequest &asked) {
+            const auto *frame = dynamic_cast<const DeskFrame *>(UXTPMDIFrameWnd::Get());
+            const QString origin = frame != nullptr ? frame->OriginFile(asked.document) : QString();
+            return askSavePath(parent, withProposedName(asked, origin));
+        });
     });
     setSaveFailure(sayNotSaved);
 }

@@ -26,7 +26,12 @@ enum DeskCommandId : unsigned
     viewUnitsBarCommand = 33283,
     chooseUnitsCommand = 33284,
     viewNotesCommand = 33285,
-    goToNotesCommand = 33286
+    goToNotesCommand = 33286,
+    exportPdfCommand = 33290,
+    exportRichTextCommand = 33291,
+    exportTextCommand = 33292,
+    commandListCommand = 33293,
+    keepReportWindowCommand = 33294
 };
 
 } // namespace kareport

@@ -1,56 +1,55 @@
 #include "DeskFrame.h"
 
-#include "AppMessageBox.h"
+#include "AboutDialog.h"
+#include "CommandList.h"
+#include "CommandTips.h"
+#include "DeskPreferences.h"
 #include "DeskSheets.h"
+#include "FileDrops.h"
+#include "FileKind.h"
 #include "Folders.h"
+#include "GuidePages.h"
+#include "HelpWindow.h"
 #include "JobLauncher.h"
 #include "OpenTemplate.h"
 #include "PreferencesDialog.h"
+#include "ProgramIcon.h"
 #include "ReportEntry.h"
-#include "ReportResources.h"
 #include "ReportSaveName.h"
 #include "SaveAs.h"
+#include "ScreenFit.h"
+#include "Session.h"
+#include "StartPage.h"
+#include "TabClosing.h"
 #include "TemplateDialog.h"
 #include "UApplication.h"
 #include "UReportDoc.h"
+#include "WindowList.h"
 #include "WorkAside.h"
 #include "Xlate.h"
 
+#include <QApplication>
 #include <QCloseEvent>
-#include <QDragEnterEvent>
 #include <QFileDialog>
-#include <QMimeData>
-#include <QStatusBar>
+#include <QMenuBar>
 #include <QTimer>
 
 DeskFrame::DeskFrame() : files_([this](const QString &path) { fileChanged(path); })
 {
     commands_ = makeCommands();
     kareport::setFileOpener([this](const QString &path) { return OpenFile(path); });
-    setWindowTitle(Xlate(kareport::reportString(kareport::moduleTitle)));
-    setAcceptDrops(true);
+    keepsReportWindows_ = kareport::loadPreferences().keepsReportWindows;
+    setWindowIcon(kareport::programIcon());
+    new kareport::FileDrops(*this, [this](const QStringList &files) { openDropped(files); });
+    new kareport::TabClosing(*this);
+    new kareport::HelpKey(*this);
+    new kareport::CommandTips(*this, [this] { UpdateCommands(); });
+    new kareport::ScreenFit(*this);
     constexpr QSize usualSize(1000, 760);
-    resize(usualSize);
+    resize(kareport::fittingSize(*this, usualSize));
     makeMenus();
-    statusBar()->showMessage(Xlate("Open a job or a saved report, or drop it here."));
-    askFile = [this]() -> std::optional<QString> {
-        const QString path =
-            QFileDialog::getOpenFileName(this, Xlate("Open"), GetInitialOpenDir(kareport::lastReportFolder),
-                                         Xlate("Reports, jobs and templates (*.rep *.rtf *.json *.xml)") +
-                                             QStringLiteral(";;") + Xlate("All files (*)"));
-        return path.isEmpty() ? std::nullopt : std::optional(path);
-    };
-    askExport = [this](const kareport::SaveRequest &request) -> std::optional<QString> {
-        const std::optional<kareport::SaveChoice> choice = kareport::askSavePath(this, request);
-        return choice ? std::optional(choice->path) : std::nullopt;
-    };
-    askTemplate = [this](const QString &templateFile) -> std::optional<kareport::TemplateJob> {
-        kareport::TemplateDialog dialog(this);
-        if (!templateFile.isEmpty()) {
-            dialog.setFile(templateFile);
-        }
-        return dialog.exec() == QDialog::Accepted ? std::optional(dialog.job()) : std::nullopt;
-    };
+    makeStartPage();
+    askNames();
     loadLayout();
     UpdateCommands();
     constexpr int unseenInterval = 500; // milliseconds
@@ -62,6 +61,29 @@ DeskFrame::DeskFrame() : files_([this](const QString &path) { fileChanged(path);
     auto *recoveryTimer = new QTimer(this);
     connect(recoveryTimer, &QTimer::timeout, this, [this] { recovery_.keep(); });
     recoveryTimer->start(recoveryInterval);
+}
+
+void DeskFrame::askNames()
+{
+    askFile = [this]() -> std::optional<QString> {
+        const QString path =
+            QFileDialog::getOpenFileName(this, Xlate("Open"), GetInitialOpenDir(kareport::lastReportFolder),
+                                         Xlate("Reports, jobs and templates (*.rep *.rtf *.json *.xml)") +
+                                             QStringLiteral(";;") + Xlate("All files (*)"));
+        return path.isEmpty() ? std::nullopt : std::optional(path);
+    };
+    askExportFile = [this](const kareport::SaveRequest &request) { return kareport::askSavePath(this, request); };
+    askExport = [this](const kareport::SaveRequest &request) -> std::optional<QString> {
+        const std::optional<kareport::SaveChoice> choice = kareport::askSavePath(this, request);
+        return choice ? std::optional(choice->path) : std::nullopt;
+    };
+    askTemplate = [this](const QString &templateFile) -> std::optional<kareport::TemplateJob> {
+        kareport::TemplateDialog dialog(this);
+        if (!templateFile.isEmpty()) {
+            dialog.setFile(templateFile);
+        }
+        return dialog.exec() == QDialog::Accepted ? std::optional(dialog.job()) : std::nullopt;
+    };
 }
 
 DeskFrame::~DeskFrame()
@@ -102,16 +124,29 @@ void DeskFrame::askPreferences()
             kareport::usePaper(dialog.preferences()); // else that of the page set-up stays
             kareport::restartAllSheets();
         }
+        keepsReportWindows_ = dialog.preferences().keepsReportWindows;
     }
 }
 
 void DeskFrame::about()
 {
-    kareport::showMessage(
-        {Xlate("KaReport: fixed-pitch reports for civil engineering and surveying.\n\n"
-               "Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and print it. "
-               "Ctrl+F finds text, Ctrl+G goes to a page, Ctrl+wheel zooms."),
-         Xlate("About KaReport"), MessageButtons::Ok, kareport::MessageIcon::Information});
+    kareport::AboutDialog(this).exec();
+}
+
+void DeskFrame::ShowHelp()
+{
+    const QWidget *focus = QApplication::focusWidget();
+    kareport::showGuide(*this, kareport::guidePlaceFor(focus));
+}
+
+void DeskFrame::chooseCommand()
+{
+    UpdateCommands();
+    kareport::CommandList list(kareport::listedCommands(*menuBar()), this);
+    if (list.exec() == QDialog::Accepted && list.chosen() != nullptr) {
+        UpdateCommands();
+        list.chosen()->trigger();
+    }
 }
 
 void DeskFrame::closeEvent(QCloseEvent *event)
@@ -140,24 +175,19 @@ void DeskFrame::closeEvent(QCloseEvent *event)
             return;
         }
     }
+    kareport::keepSession(openFiles());
     UApplication::Get()->CloseAllDocuments();
     saveLayout();
     event->accept();
 }
 
-void DeskFrame::dragEnterEvent(QDragEnterEvent *event)
+void DeskFrame::openDropped(const QStringList &files)
 {
-    if (event->mimeData()->hasUrls()) {
-        event->acceptProposedAction();
-    }
-}
-
-void DeskFrame::dropEvent(QDropEvent *event)
-{
-    event->acceptProposedAction();
-    for (const QUrl &url : event->mimeData()->urls()) {
-        if (url.isLocalFile()) {
-            OpenFile(url.toLocalFile());
+    for (const QString &file : files) {
+        if (kareport::isDataName(file)) {
+            fromTemplate(file);
+        } else {
+            OpenFile(file);
         }
     }
 }

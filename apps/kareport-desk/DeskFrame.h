@@ -1,17 +1,20 @@
 #pragma once
 
+#include "CommandReasons.h"
 #include "DeskRuns.h"
 #include "EditorHold.h"
 #include "FileWatch.h"
 #include "JobExport.h"
+#include "OutputKind.h"
 #include "Recovery.h"
-#include "SaveDialog.h"
+#include "SaveAs.h"
 #include "UDocument.h"
 #include "UXTPMDIFrameWnd.h"
 
 #include <QLatin1StringView>
 
 #include <functional>
+#include <memory>
 #include <optional>
 
 class QMenu;
@@ -20,6 +23,8 @@ class UReportDoc;
 
 namespace kareport
 {
+class StartPage;
+class WindowList;
 struct ReadNotes;
 struct TemplateJob;
 } // namespace kareport
@@ -47,6 +52,16 @@ public:
     /// Offers what a program that crashed had open.
     void OfferLeftReports();
 
+    /// Opens what was open when the program ended, where the user wants that.
+    void RestoreSession();
+
+    /// The job, or the data, that a report was made of; empty for one that was not.
+    QString OriginFile(const UDocument *report) const;
+    /// Shows the place of the guides that fits what the user looks at.
+    void ShowHelp();
+
+    void UpdateCommands() override;
+
     /// Told by the application what becomes of documents: their files are watched.
     void NoteDocumentEvent(UDocument &document, UDocument::DocumentEvent event);
 
@@ -60,17 +75,36 @@ public:
 
     /// Asks where the values of a report go; a test answers instead.
     std::function<std::optional<QString>(const kareport::SaveRequest &)> askExport;
+    /// Asks where a report is exported to; a test answers instead.
+    std::function<std::optional<kareport::SaveChoice>(const kareport::SaveRequest &)> askExportFile;
 
 protected:
     void SettlePanes() override;
+    bool CanAct(unsigned command) const override;
+    void childEvent(QChildEvent *event) override;
     void closeEvent(QCloseEvent *event) override;
-    void dragEnterEvent(QDragEnterEvent *event) override;
-    void dropEvent(QDropEvent *event) override;
 
 private:
     std::vector<kareport::Command> makeCommands();
+    void askNames();
     void makeMenus();
+    void makeFileMenu(QMenu &file);
+    void makeEditMenu(QMenu &edit);
+    void makeToolBar();
+    void makeStartPage();
     void fillRecentFiles();
+    /// Shows the start page while no report is docked in the window.
+    void updateStartPage();
+    /// Opens files that were dropped: data is proposed for a new report.
+    void openDropped(const QStringList &files);
+    /// Lets the report window of a job give way to the report, unless it is to be kept.
+    void giveWay(UDocument *report);
+    void keepReportWindow();
+    void chooseCommand();
+    /// Writes the report in front into a file of another kind.
+    void exportAs(kareport::OutputKind kind);
+    /// What is open and can be opened again.
+    QStringList openFiles() const;
 
     void newReport();
     void open();
@@ -113,7 +147,11 @@ private:
     std::vector<kareport::Command> commands_;
     QMenu *recentFiles_ = nullptr;
     QToolBar *toolBar_ = nullptr;
-    QStringList reading_; ///< files that are being opened now
+    kareport::StartPage *start_ = nullptr;
+    std::unique_ptr<kareport::WindowList> windows_;
+    bool keepsReportWindows_ = false;
+    kareport::DeskState state_; ///< as of the last update of the commands
+    QStringList reading_;       ///< files that are being opened now
     kareport::FileWatch files_;
     kareport::Recovery recovery_;
     kareport::EditorHold editors_;

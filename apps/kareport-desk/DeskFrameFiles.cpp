@@ -6,10 +6,13 @@
 #include "JobLauncher.h"
 #include "LandXmlContents.h"
 #include "OpenTemplate.h"
+#include "ReportExport.h"
 #include "ReportSaveName.h"
 #include "SavedReports.h"
+#include "ShippedExamples.h"
 #include "UApplication.h"
 #include "UReportDoc.h"
+#include "UReportWindowDlg.h"
 #include "UView.h"
 #include "Xlate.h"
 
@@ -85,6 +88,9 @@ void DeskFrame::exportValues()
     request.filter = kareport::exportFilter();
     request.initialFolder = GetInitialOpenDir(kareport::lastReportFolder);
     request.flags = kareport::SaveRequest::overwritePrompt | kareport::SaveRequest::pathMustExist;
+    request.document = GetCommandDocument();
+    request = kareport::withProposedName(request, OriginFile(request.document));
+    request.document = nullptr; // it is not the report that is saved: no open file is replaced
     const auto file = askExport(request);
     if (!file) {
         return;
@@ -98,6 +104,41 @@ void DeskFrame::exportValues()
         kareport::showMessage(
             {Xlate("\"%1\" was saved, but it differs from the report:\n\n%2").arg(*file, warnings.join(u'\n')),
              QString(), MessageButtons::Ok, kareport::MessageIcon::Information});
+    }
+}
+
+void DeskFrame::giveWay(UDocument *report)
+{
+    auto *made = dynamic_cast<UReportDoc *>(report);
+    auto *window = made != nullptr ? dynamic_cast<UReportWindowDlg *>(made->GetReportWindow()) : nullptr;
+    if (window != nullptr && !keepsReportWindows_) {
+        window->ShowReport();
+    }
+}
+
+void DeskFrame::exportAs(kareport::OutputKind kind)
+{
+    auto *report = dynamic_cast<UReportDoc *>(GetCommandDocument());
+    if (report == nullptr) {
+        return;
+    }
+    const QString folder = GetInitialOpenDir(kareport::lastReportFolder);
+    const auto choice =
+        askExportFile(kareport::withProposedName(kareport::exportRequest(*report, kind, folder), OriginFile(report)));
+    if (!choice || !UReportDoc::IsReportAvailable(report)) {
+        return; // it may have been closed while the dialog was open
+    }
+    SetLastOpenDir(choice->path, kareport::lastReportFolder);
+    QStringList warnings;
+    const QString problem = kareport::exportReport(*report, *choice, warnings);
+    if (!problem.isEmpty()) {
+        kareport::sayNotSaved(choice->path, problem);
+    } else if (!warnings.isEmpty()) {
+        kareport::showMessage(
+            {Xlate("\"%1\" was saved, but it differs from the report:\n\n%2").arg(choice->path, warnings.join(u'\n')),
+             QString(), MessageButtons::Ok, kareport::MessageIcon::Information});
+    } else {
+        statusBar()->showMessage(Xlate("Exported to \"%1\".").arg(choice->path));
     }
 }
 
@@ -134,9 +175,10 @@ bool DeskFrame::OpenFile(const QString &path)
 bool DeskFrame::openJob(const kareport::ReportRecipe &recipe)
 {
     QString error;
-    UDocument *report = runs_.run(recipe, error);
+    UReportDoc *report = runs_.run(recipe, error);
+    giveWay(report);
     const bool isMade = finishOpening(report, error);
-    if (isMade && !recipe.jobFile().isEmpty()) {
+    if (isMade && !recipe.jobFile().isEmpty() && !kareport::isShippedExample(recipe.jobFile())) {
         UApplication::Get()->AddToRecentFileList(recipe.jobFile());
     }
     runs_.showFront();

@@ -85,6 +85,7 @@ void DeskFrame::closeUnseen()
 void DeskFrame::SettlePanes()
 {
     closeUnseen();
+    updateStartPage();
     UXTPMDIFrameWnd::SettlePanes();
 }
 

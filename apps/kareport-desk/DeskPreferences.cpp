@@ -24,6 +24,13 @@ const QString keepEntry = QStringLiteral("KeepReportForEditor");
 const QString paperEntry = QStringLiteral("Paper");
 const QString unitEntry = QStringLiteral("Unit of Margins");
 const QString languageEntry = QStringLiteral("Language");
+const QString reportWindowsEntry = QStringLiteral("KeepReportWindows");
+const QString sessionEntry = QStringLiteral("RestoreSession");
+
+void writeFlag(const QString &entry, bool on)
+{
+    WriteProfileString(QString(), entry, on ? QStringLiteral("1") : QStringLiteral("0"));
+}
 
 UJobSettings settingsFromText(const QString &text)
 {
@@ -77,7 +84,14 @@ DeskPreferences loadPreferences()
     preferences.editor = GetProfileString(QString(), GetPreferredReportEditorRegKey());
     preferences.keepsForEditor = GetProfileString(QString(), keepEntry) != u"0";
     preferences.language = GetProfileString(QString(), languageEntry);
+    preferences.keepsReportWindows = GetProfileString(QString(), reportWindowsEntry) == u"1";
+    preferences.restoresSession = GetProfileString(QString(), sessionEntry) == u"1";
     return preferences;
+}
+
+void saveKeepsReportWindows(bool keeps)
+{
+    writeFlag(reportWindowsEntry, keeps);
 }
 
 void savePreferences(const DeskPreferences &preferences)
@@ -93,7 +107,9 @@ void savePreferences(const DeskPreferences &preferences)
     WriteProfileString(QString(), unitEntry, preferences.inInches ? QStringLiteral("in") : QStringLiteral("mm"));
     SetUsePreferredReportEditorFlag(preferences.usesEditor);
     WriteProfileString(QString(), GetPreferredReportEditorRegKey(), preferences.editor);
-    WriteProfileString(QString(), keepEntry, preferences.keepsForEditor ? QStringLiteral("1") : QStringLiteral("0"));
+    saveKeepsReportWindows(preferences.keepsReportWindows);
+    writeFlag(sessionEntry, preferences.restoresSession);
+    writeFlag(keepEntry, preferences.keepsForEditor);
     WriteProfileString(QString(), languageEntry, preferences.language);
 }
 

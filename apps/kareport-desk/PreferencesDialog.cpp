@@ -8,6 +8,7 @@
 #include "UnitsPage.h"
 #include "Xlate.h"
 
+#include <QCheckBox>
 #include <QComboBox>
 #include <QDialogButtonBox>
 #include <QFormLayout>
@@ -58,7 +59,9 @@ PreferencesDialog::PreferencesDialog(const DeskPreferences &preferences, QWidget
       unit_(new QComboBox),
       page_(makePageForm(preferences)),
       editor_(new EditorPage(preferences.usesEditor, preferences.editor, preferences.keepsForEditor)),
-      language_(new QComboBox)
+      language_(new QComboBox),
+      reportWindows_(new QCheckBox(Xlate("&Keep the report window when a job is done"))),
+      session_(new QCheckBox(Xlate("Open at the &start what was open at the end")))
 {
     setWindowTitle(Xlate("Preferences"));
     setWindowFlag(Qt::WindowContextHelpButtonHint, false);
@@ -93,6 +96,10 @@ PreferencesDialog::PreferencesDialog(const DeskPreferences &preferences, QWidget
     auto *programLayout = new QFormLayout(program);
     programLayout->setFieldGrowthPolicy(QFormLayout::FieldsStayAtSizeHint);
     programLayout->addRow(Xlate("&Language (from the next start):"), language_);
+    reportWindows_->setChecked(preferences.keepsReportWindows);
+    session_->setChecked(preferences.restoresSession);
+    programLayout->addRow(session_);
+    programLayout->addRow(reportWindows_);
 
     tabs_->addTab(units_, Xlate("&Units and Formats"));
     tabs_->addTab(page, Xlate("&Page"));
@@ -121,6 +128,8 @@ DeskPreferences PreferencesDialog::preferences() const
     preferences.editor = editor_->editor();
     preferences.keepsForEditor = editor_->keepsReports();
     preferences.language = language_->currentData().toString();
+    preferences.keepsReportWindows = reportWindows_->isChecked();
+    preferences.restoresSession = session_->isChecked();
     return preferences;
 }
 

@@ -4,6 +4,7 @@
 
 #include <QDialog>
 
+class QCheckBox;
 class QComboBox;
 class QSpinBox;
 class QTabWidget;
@@ -32,6 +33,8 @@ private:
     PageSetupForm *page_;
     EditorPage *editor_;
     QComboBox *language_;
+    QCheckBox *reportWindows_;
+    QCheckBox *session_;
 };
 
 } // namespace kareport

@@ -8,6 +8,7 @@
 #include "Folders.h"
 #include "JobOutputs.h"
 #include "PdfExport.h"
+#include "ProposedName.h"
 #include "ReplaceFile.h"
 #include "ReportSaveName.h"
 #include "ReportViews.h"
@@ -19,6 +20,8 @@
 #include <QAbstractItemView>
 #include <QFileDialog>
 #include <QFileInfo>
+#include <QLineEdit>
+#include <QListView>
 
 #include <algorithm>
 
@@ -98,6 +101,35 @@ bool mayReplace(const QString &path, const SaveRequest &request)
                         MessageButtons::YesNo, MessageIcon::Question}) == MessageAnswer::Yes;
 }
 
+/// Whenever another kind is chosen, the name in the dialog gets its ending.
+void followKind(QFileDialog &dialog, const QStringList &titles, const QStringList &patterns)
+{
+    QObject::connect(&dialog, &QFileDialog::filterSelected, &dialog, [&dialog, titles, patterns](const QString &title) {
+        const QString name = dialog.selectedFiles().value(0);
+        const QString other = withOtherEnding(name, patterns.value(titles.indexOf(title)), patterns);
+        if (other != name && !QFileInfo(name).isDir()) {
+            dialog.selectFile(other);
+        }
+    });
+}
+
+/// What is typed counts: not a file that the dialog has selected because it has the name that was proposed.
+void letTextCount(const QFileDialog &dialog)
+{
+    const auto *field = dialog.findChild<QLineEdit *>(QStringLiteral("fileNameEdit"));
+    auto *list = dialog.findChild<QListView *>(QStringLiteral("listView"));
+    if (field == nullptr || list == nullptr) {
+        return; // the dialog is the system's
+    }
+    QObject::connect(field, &QLineEdit::textChanged, list, [list](const QString &text) {
+        const QModelIndexList rows = list->selectionModel()->selectedRows();
+        if (std::any_of(rows.begin(), rows.end(),
+                        [&text](const QModelIndex &row) { return row.data().toString() != text; })) {
+            list->selectionModel()->clearSelection();
+        }
+    });
+}
+
 PdfDetails detailsOf(const UReportDoc &report)
 {
     PdfDetails details;
@@ -137,6 +169,21 @@ void exportPdf(const UReportDoc &report, const SaveChoice &choice)
 
 } // namespace
 
+SaveRequest withProposedName(const SaveRequest &request, const QString &origin)
+{
+    const auto *report = dynamic_cast<const UReportDoc *>(request.document);
+    if (report == nullptr || !request.fileName.isEmpty()) {
+        return request;
+    }
+    const std::vector<OfferedKind> kinds = kindsOf(request.filter);
+    const QString ending = kinds.empty() || !kinds.front().pattern.startsWith(u"*.") ? request.defaultExtension
+                                                                                     : kinds.front().pattern.mid(2);
+    SaveRequest proposing = request;
+    proposing.fileName =
+        proposedName({report->GetTitle(), report->GetPathName(), origin, request.initialFolder}, ending);
+    return proposing;
+}
+
 QString withEndingOf(const QString &path, const QString &kind, const QStringList &kinds)
 {
     const bool isKnown = std::any_of(kinds.begin(), kinds.end(), [&path](const QString &known) {
@@ -165,8 +212,13 @@ std::optional<SaveChoice> askSavePath(QWidget *parent, const SaveRequest &reques
     for (QAbstractItemView *view : dialog.findChildren<QAbstractItemView *>()) {
         view->setContextMenuPolicy(Qt::NoContextMenu); // it would ask before it deletes a file
     }
+    followKind(dialog, titles, patterns);
+    letTextCount(dialog);
     if (!request.fileName.isEmpty()) {
-        dialog.selectFile(request.fileName);
+        if (QFileInfo(request.fileName).isAbsolute()) {
+            dialog.setDirectory(QFileInfo(request.fileName).absolutePath());
+        }
+        dialog.selectFile(QFileInfo(request.fileName).fileName());
     }
     while (dialog.exec() == QDialog::Accepted) {
         const qsizetype chosen = titles.indexOf(dialog.selectedNameFilter());

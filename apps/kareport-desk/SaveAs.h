@@ -22,6 +22,10 @@ struct SaveChoice
     bool hasOutline; ///< of a PDF: it has title, outline and page labels
 };
 
+/// A question for the name of a report's file with a name to begin with, where it has none: see `proposedName`.
+/// @param origin  the file that the report was made of; empty for none
+SaveRequest withProposedName(const SaveRequest &request, const QString &origin);
+
 /// Asks for the name of a file to save in. Its ending follows the kind that is chosen, and a file is only replaced when the
 /// user says so. A report may become a PDF with an outline as well.
 std::optional<SaveChoice> askSavePath(QWidget *parent, const SaveRequest &request);

@@ -1,5 +1,6 @@
 #include "TemplateDialog.h"
 
+#include "FileKind.h"
 #include "Folders.h"
 #include "ImportPanel.h"
 #include "OpenTemplate.h"
@@ -145,6 +146,10 @@ void TemplateDialog::setData(const QString &path)
 
 void TemplateDialog::setFile(const QString &path)
 {
+    if (isDataName(path)) {
+        data_->setText(path);
+        return;
+    }
     const auto file = FileBytes::open(path);
     const auto *opened = std::get_if<std::shared_ptr<const FileBytes>>(&file);
     (opened != nullptr && isLandXml(*opened) ? data_ : file_)->setText(path);

@@ -32,7 +32,7 @@ public:
     TemplateJob job() const;
     void setTemplateFile(const QString &path);
     void setData(const QString &path);
-    /// Takes a file for the data where it is LandXML, and otherwise for the template file.
+    /// Takes a file for the data where its name or its content says that it is, and otherwise for the template file.
     void setFile(const QString &path);
     void accept() override;
 

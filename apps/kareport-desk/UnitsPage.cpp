@@ -154,6 +154,9 @@ UnitsPage::UnitsPage(const UJobSettings &settings, QWidget *parent)
     auto *sampleLayout = new QHBoxLayout(sampleBox);
     samples_->setFont(QFontDatabase::systemFont(QFontDatabase::FixedFont));
     samples_->setAlignment(Qt::AlignTop | Qt::AlignLeft);
+    // As wide as the widest of them from the beginning, so that nothing moves when another unit is chosen.
+    constexpr int widestSample = 22; // characters
+    samples_->setMinimumWidth(QFontMetrics(samples_->font()).averageCharWidth() * widestSample);
     sampleLayout->addWidget(samples_);
     layout->addWidget(sampleBox);
 

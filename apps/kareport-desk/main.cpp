@@ -3,11 +3,12 @@
 #include "DeskPreferences.h"
 #include "Language.h"
 #include "ProcessSetup.h"
+#include "ProgramIcon.h"
+#include "Readable.h"
 #include "Xlate.h"
 
 #include <QApplication>
 #include <QCommandLineParser>
-#include <QIcon>
 
 int main(int argc, char **argv)
 {
@@ -17,7 +18,8 @@ int main(int argc, char **argv)
     QApplication::setApplicationName(QStringLiteral("KaReport"));
     QApplication::setApplicationVersion(QStringLiteral(KAREPORT_VERSION));
     QApplication::setDesktopFileName(QStringLiteral("kareport-desk"));
-    QApplication::setWindowIcon(QIcon::fromTheme(QStringLiteral("kareport")));
+    QApplication::setWindowIcon(kareport::programIcon());
+    QApplication::setPalette(kareport::readablePalette(QApplication::palette()));
     kareport::setLanguage(kareport::loadPreferences().language);
     QCommandLineParser parser;
     parser.setApplicationDescription(Xlate("Runs report jobs, and shows, edits and prints reports."));
@@ -33,6 +35,9 @@ int main(int argc, char **argv)
     kareport::installDialogs(&frame);
     frame.show();
     frame.OfferLeftReports();
+    if (parser.positionalArguments().isEmpty() && kareport::loadPreferences().restoresSession) {
+        frame.RestoreSession();
+    }
     for (const QString &file : parser.positionalArguments()) {
         frame.OpenFile(file);
     }

@@ -2,6 +2,7 @@
 
 #include "COneViewPane.h"
 #include "UXTPMDIFrameWnd.h"
+#include "Xlate.h"
 
 #include <QAction>
 #include <QCloseEvent>
@@ -63,12 +64,21 @@ void PaneDock::setMarked(bool marked)
     }
 }
 
+void PaneDock::setUnsaved(bool unsaved)
+{
+    if (unsaved_ != unsaved) {
+        unsaved_ = unsaved;
+        showCaption();
+    }
+}
+
 void PaneDock::showCaption()
 {
     // On tabs and title bars an ampersand marks a key.
     const QString text = QString(caption_).replace(u'&', QStringLiteral("&&"));
-    setWindowTitle(marked_ && isFloating() ? QStringLiteral("\u25CF ") + text : text);
-    setAccessibleName(caption_);
+    const QString star = unsaved_ ? QStringLiteral(" *") : QString();
+    setWindowTitle(marked_ && isFloating() ? QStringLiteral("\u25CF ") + text + star : text + star);
+    setAccessibleName(unsaved_ ? Xlate("%1, not saved").arg(caption_) : caption_);
 }
 
 bool PaneDock::isTabbedAgainstItsWill() const

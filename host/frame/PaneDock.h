@@ -22,6 +22,8 @@ public:
     /// Shows the caption highlighted: by its colour, and where the window system draws it, by a dot before the text.
     void setMarked(bool marked);
     bool isMarked() const { return marked_; }
+    /// Shows that there are changes that are not saved: by a star after the caption, on the tab as well.
+    void setUnsaved(bool unsaved);
 
     /// Whether the dock widget is in a row of tabs that the pane is not in.
     bool isTabbedAgainstItsWill() const;
@@ -48,6 +50,7 @@ private:
     COneViewPane *pane_;
     QString caption_;
     bool marked_ = false;
+    bool unsaved_ = false;
     bool wasInFront_ = false;
 };
 

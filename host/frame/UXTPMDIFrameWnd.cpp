@@ -105,11 +105,16 @@ void UXTPMDIFrameWnd::UpdateCommands()
         const bool known = (shown != nullptr && shown->updateCommand(action.key(), state)) ||
                            (target != nullptr && target->updateCommand(action.key(), state)) ||
                            updateCommand(action.key(), state);
-        action.value()->setEnabled(known && state.enabled);
+        action.value()->setEnabled(known && state.enabled && CanAct(action.key()));
         if (action.value()->isCheckable()) {
             action.value()->setChecked(state.checked);
         }
     }
+}
+
+bool UXTPMDIFrameWnd::CanAct(unsigned /*command*/) const
+{
+    return true;
 }
 
 bool UXTPMDIFrameWnd::event(QEvent *event)

@@ -61,7 +61,7 @@ public:
     /// Runs a command wherever it is handled. @return false when nothing handles it
     bool OnCommand(unsigned id);
     /// Brings the state of all actions up to date.
-    void UpdateCommands();
+    virtual void UpdateCommands();
 
     /// Docks a pane among the others: next to them as a tab, unless it has a place of its own.
     virtual void DockPane(COneViewPane &pane);
@@ -74,6 +74,9 @@ protected:
     /// Called when panes were shown, hidden, raised or closed: makes the one in front that was used last the active one,
     /// unless the active one is in front.
     virtual void SettlePanes();
+    /// Whether a command that its handler enables has something to act on. A frame that wants to say more of its commands than
+    /// the handlers do, overrides it: what it answers false for is disabled. Here always true.
+    virtual bool CanAct(unsigned command) const;
 
 private:
     friend class COneViewPane;

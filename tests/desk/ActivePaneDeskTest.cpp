@@ -23,6 +23,7 @@ void settle()
 UReportDoc *runJob(Desk &desk, const JobFolder &folder, const char *name, const char *line)
 {
     folder.put(name, lineJob(line));
+    desk.keepReportWindows();
     desk.frame->OpenFile(folder.path(name));
     settle();
     return Desk::reports().back();

@@ -88,6 +88,7 @@ TEST(DeskFrameChanges, AReportOfAJobWithARichTextImageIsEditedSavedAndLoadedAgai
                              "output": [{"file": "word.rtf", "as": "rtf-image"}]})");
     Desk desk;
     desk.answer = MessageAnswer::No;
+    desk.keepReportWindows();
     ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.json")));
     UReportDoc *report = Desk::reports().front();
     EXPECT_FALSE(report->GetRTFDataFlag()) << "the view shows the text";
@@ -120,6 +121,7 @@ TEST(DeskFrameChanges, WhatIsTypedAfterAReportWasGivenUpIsNotThrownAway)
     {
         Desk desk;
         desk.answer = MessageAnswer::No;
+        desk.keepReportWindows();
         const JobFolder folder;
         folder.put("a.json", lineJob());
         ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.json")));

@@ -94,9 +94,10 @@ TEST(DeskFrame, SaysTheNotesOnAReportThatWasMade)
     EXPECT_EQ(Desk::reports().size(), 1U) << "nothing half made stays";
 }
 
-TEST(DeskFrame, AJobRunsIntoAReportWindow)
+TEST(DeskFrame, AJobRunsIntoAReportWindowThatIsKept)
 {
     Desk desk;
+    desk.keepReportWindows();
     desk.answer = MessageAnswer::No;
     const JobFolder folder;
     folder.put("a.json", lineJob());
@@ -126,6 +127,7 @@ TEST(DeskFrame, AJobRunsIntoAReportWindow)
 TEST(DeskFrame, AReportWhoseWindowIsClosedCloses)
 {
     Desk desk;
+    desk.keepReportWindows();
     desk.answer = MessageAnswer::No; // it is not to be saved
     const JobFolder folder;
     folder.put("a.json", lineJob());
@@ -145,6 +147,7 @@ TEST(DeskFrame, AReportWhoseWindowIsClosedCloses)
 TEST(DeskFrame, AReportThatCouldNotBeSavedIsNotThrownAwayWithItsWindow)
 {
     Desk desk;
+    desk.keepReportWindows();
     const JobFolder folder;
     folder.put("a.json", lineJob());
     ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.json")));

@@ -84,9 +84,8 @@ TEST(DeskFrameWindows, CommandsFollowWhetherAReportIsOpen)
 {
     Desk desk;
     desk.frame->UpdateCommands();
-    const unsigned needing[] = {fileSaveCommand,     fileSaveAsCommand, filePrintCommand,
-                                printPreviewCommand, pageSetupCommand,  copyCommand,
-                                findCommand,         windowNewCommand,  windowCascadeCommand};
+    const unsigned needing[] = {fileSaveCommand,  fileSaveAsCommand, filePrintCommand, printPreviewCommand,
+                                pageSetupCommand, findCommand,       windowNewCommand, exportPdfCommand};
     for (const unsigned id : needing) {
         EXPECT_FALSE(desk.frame->CommandAction(id)->isEnabled()) << id;
     }

@@ -58,6 +58,7 @@ protected:
 TEST_F(FloatingPanes, HaveTheKeyboardInTheTextOfTheOneThatWasDragged)
 {
     folder.put("a.json", lineJob());
+    desk.keepReportWindows();
     ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.json")));
     const UReportDoc *report = Desk::reports().back();
     ASSERT_TRUE(desk.frame->OnCommand(kareport::windowNewCommand)) << "beside the hidden pane, as a tab";
@@ -124,6 +125,7 @@ TEST(DraggedPanes, AreWhereTheyWereDroppedAtOnce)
         for (int y = -200; y <= 200; y += 100) {
             Desk desk;
             desk.answer = MessageAnswer::No;
+            desk.keepReportWindows();
             const JobFolder folder;
             ASSERT_TRUE(desk.frame->OnCommand(kareport::fileNewCommand));
             for (const char *name : {"a.json", "b.json", "c.json"}) {

@@ -253,6 +253,7 @@ TEST(SaveAs, TheReportWindowExportsLikewise)
     const JobFolder folder;
     folder.put("a.json", lineJob());
     SavingDesk desk;
+    desk.keepReportWindows();
     ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.json")));
     UReportDoc *report = Desk::reports().front();
     auto *window = dynamic_cast<UReportWindowDlg *>(report->GetReportWindow());

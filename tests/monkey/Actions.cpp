@@ -6,11 +6,13 @@
 #include "DeskCommandIds.h"
 #include "DeskFrame.h"
 #include "DeskPreferences.h"
+#include "HelpWindow.h"
 #include "OpenTemplate.h"
 #include "PaneDock.h"
 #include "ReportEdit.h"
 #include "ReportResources.h"
 #include "SheetColumn.h"
+#include "StartPage.h"
 #include "TemplateTextEdit.h"
 #include "TemplateWindow.h"
 #include "UReportDoc.h"
@@ -103,6 +105,17 @@ void collect(const QMenu &menu, QList<QAction *> &actions)
     }
 }
 
+/// The guide is read and closed again: what follows is done in the main window.
+void closeGuide(World &world)
+{
+    for (QObject *child : world.frame().children()) {
+        if (auto *guide = dynamic_cast<kareport::HelpWindow *>(child); guide != nullptr && guide->isVisible()) {
+            guide->close();
+            world.frame().activateWindow();
+        }
+    }
+}
+
 void chooseFromMenu(World &world, Chance &chance)
 {
     QList<QAction *> actions;
@@ -122,6 +135,7 @@ void chooseFromMenu(World &world, Chance &chance)
     aimKeyboard(world);
     world.did = action->text();
     action->trigger();
+    closeGuide(world);
 }
 
 void runCommand(World &world, unsigned id)
@@ -209,6 +223,36 @@ void clickTab(World &world, Chance &chance)
     const int tab = chance.below(bar->count());
     world.did = bar->tabText(tab);
     QTest::mouseClick(bar, Qt::LeftButton, Qt::NoModifier, bar->tabRect(tab).center());
+}
+
+void middleClickTab(World &world, Chance &chance)
+{
+    for (QTabBar *bar : world.frame().findChildren<QTabBar *>()) {
+        if (bar->isVisible() && bar->count() > 1) {
+            const int tab = chance.below(bar->count());
+            world.did = bar->tabText(tab);
+            QTest::mouseClick(bar, Qt::MiddleButton, Qt::NoModifier, bar->tabRect(tab).center());
+            return;
+        }
+    }
+}
+
+/// Chooses an entry of the start page, where that is shown.
+void useStartPage(World &world, Chance &chance)
+{
+    const auto *page = dynamic_cast<const kareport::StartPage *>(world.frame().centralWidget());
+    if (page == nullptr || !page->isVisible()) {
+        return;
+    }
+    kareport::EntryList &list = chance.oneIn(3) ? page->exampleList() : page->recentList();
+    if (list.count() == 0) {
+        return;
+    }
+    const int row = chance.below(list.count());
+    world.did = list.item(row)->text();
+    list.setCurrentRow(row);
+    QTest::keyClick(&list, Qt::Key_Return);
+    QCoreApplication::processEvents();
 }
 
 void clickText(World & /*world*/, Chance &chance)
@@ -475,6 +519,8 @@ const std::vector<Action> &allActions()
         {"editor", 1, false, chooseEditor},
         {"end-editor", 1, false, endEditor},
         {"keep", 6, false, keep},
+        {"middle-click", 2, false, middleClickTab},
+        {"start-page", 3, false, useStartPage},
         {"exit", 2, false, exitDesk},
         {"crash", 1, false, crash},
         {"template", 1, false, editTemplate},

@@ -1,7 +1,12 @@
 #include "DeskFixture.h"
 
+#include "DeskCommandIds.h"
 #include "ReportSaveName.h"
 #include "SaveDialog.h"
+
+#include <QAction>
+
+#include <gtest/gtest.h>
 
 Desk::Desk()
 {
@@ -34,6 +39,14 @@ std::vector<UReportDoc *> Desk::reports()
         found.push_back(dynamic_cast<UReportDoc *>(document));
     }
     return found;
+}
+
+void Desk::keepReportWindows()
+{
+    frame->UpdateCommands();
+    if (!frame->CommandAction(kareport::keepReportWindowCommand)->isChecked()) {
+        ASSERT_TRUE(frame->OnCommand(kareport::keepReportWindowCommand));
+    }
 }
 
 QString Desk::textOf(const UReportDoc &report)

@@ -29,6 +29,8 @@ public:
 
     static std::vector<UReportDoc *> reports();
     static QString textOf(const UReportDoc &report);
+    /// Has reports of jobs stay in their report windows, as the user's pin does.
+    void keepReportWindows();
 
     MessageAnswer answer = MessageAnswer::Ok;
     QStringList messages;

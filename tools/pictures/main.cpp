@@ -1,9 +1,12 @@
 // Draws every window of the programs into PNG files, to be looked at and for the guides.
+#include "AboutDialog.h"
+#include "CommandList.h"
 #include "DeskApplication.h"
 #include "DeskCommandIds.h"
 #include "DeskFrame.h"
 #include "FilePlace.h"
 #include "FindBar.h"
+#include "HelpWindow.h"
 #include "ImportPanel.h"
 #include "NotesPane.h"
 #include "OpenTemplate.h"
@@ -13,6 +16,8 @@
 #include "PreferencesDialog.h"
 #include "PrintProgress.h"
 #include "Profile.h"
+#include "ProgramIcon.h"
+#include "Readable.h"
 #include "ReportEdit.h"
 #include "ReportPrinter.h"
 #include "ReportViewWidget.h"
@@ -118,13 +123,49 @@ void takeSheets(Pictures &pictures, DeskFrame &frame)
     window.goToPage(1);
 }
 
+void takeCommands(Pictures &pictures, DeskFrame &frame)
+{
+    kareport::CommandList list(kareport::listedCommands(*frame.menuBar()), &frame);
+    pictures.take(list, "commands");
+    list.findChild<QLineEdit *>()->setText(QStringLiteral("undo"));
+    pictures.take(list, "commands-reason");
+    kareport::HelpWindow help(&frame);
+    help.showPlace(QStringLiteral("guide-desk.md"));
+    pictures.take(help, "help");
+    help.showPlace(QStringLiteral("guide-desk.md#keys"));
+    pictures.take(help, "help-keys");
+    kareport::AboutDialog about(&frame);
+    pictures.take(about, "about");
+}
+
+/// The program's icon in the sizes in which it is installed.
+bool writeIcons(const QString &folder)
+{
+    bool isWritten = true;
+    for (const int size : kareport::programIconSizes) {
+        const QString place = QStringLiteral("%1/%2x%2").arg(folder).arg(size);
+        QDir().mkpath(place);
+        isWritten = kareport::programPicture(size).save(place + QStringLiteral("/kareport.png")) && isWritten;
+    }
+    return isWritten;
+}
+
 void takeDesk(Pictures &pictures, const QString &examples)
 {
     DeskApplication application;
     DeskFrame frame;
-    pictures.take(frame, "desk-empty");
+    frame.resize(1000, 760);
+    for (const char *name : {"control-metric.json", "traverse-gon.json"}) {
+        application.AddToRecentFileList(QDir(examples).filePath(QString::fromLatin1(name)));
+    }
+    application.AddToRecentFileList(QDir::home().filePath(QStringLiteral("survey/lot 7, as built.rep")));
+    frame.hide(); // the files of the start page are looked at when it is shown
+    pictures.take(frame, "desk-start");
+    takeCommands(pictures, frame);
+    frame.OnCommand(kareport::keepReportWindowCommand);
     frame.OpenFile(QDir(examples).filePath(QStringLiteral("stakeout.json")));
     pictures.take(frame, "report-window");
+    frame.OnCommand(kareport::keepReportWindowCommand);
     auto *report = dynamic_cast<UReportDoc *>(application.GetCurrentReport());
     if (auto *window = dynamic_cast<UReportWindowDlg *>(report->GetReportWindow())) {
         window->GetDock()->setFloating(true);
@@ -153,6 +194,9 @@ void takeDesk(Pictures &pictures, const QString &examples)
     frame.OnCommand(kareport::windowNewCommand);
     frame.OnCommand(kareport::windowTileVerticallyCommand);
     pictures.take(frame, "desk-tiled");
+    frame.OnCommand(kareport::windowCascadeCommand);
+    frame.OpenFile(QDir(examples).filePath(QStringLiteral("control-metric.json")));
+    pictures.take(frame, "desk-tabs");
     for (UDocument *document : application.GetDocTemplates().front()->GetDocuments()) {
         document->SetModifiedFlag(false);
     }
@@ -289,14 +333,19 @@ int main(int argc, char **argv)
                                       QStringLiteral("FOLDER"), QStringLiteral("examples"));
     const QCommandLineOption suffix(QStringLiteral("suffix"), QStringLiteral("of the files' names"),
                                     QStringLiteral("TEXT"));
-    parser.addOptions({dark, examples, suffix});
+    const QCommandLineOption icons(QStringLiteral("icons"), QStringLiteral("writes the program's icons alone"));
+    parser.addOptions({dark, examples, suffix, icons});
     parser.process(application);
     QApplication::setStyle(QStyleFactory::create(QStringLiteral("Fusion")));
     if (parser.isSet(dark)) {
         QApplication::setPalette(darkPalette());
     }
+    QApplication::setPalette(kareport::readablePalette(QApplication::palette()));
     kareport::setProfileStore(kareport::makeMemoryProfile());
     const QString folder = parser.positionalArguments().value(0, QStringLiteral("."));
+    if (parser.isSet(icons)) {
+        return writeIcons(folder) ? 0 : 1;
+    }
     QDir().mkpath(folder);
     Pictures pictures(folder, parser.value(suffix));
     takeDesk(pictures, parser.value(examples));

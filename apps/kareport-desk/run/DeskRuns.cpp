@@ -81,7 +81,12 @@ const DeskRuns::Made *DeskRuns::madeOf(const UDocument *report) const
 
 const ReportRecipe *DeskRuns::recipeInFront() const
 {
-    const Made *made = madeOf(frame_.GetCommandDocument());
+    return recipeOf(frame_.GetCommandDocument());
+}
+
+const ReportRecipe *DeskRuns::recipeOf(const UDocument *report) const
+{
+    const Made *made = madeOf(report);
     return made != nullptr ? &made->recipe : nullptr;
 }
 

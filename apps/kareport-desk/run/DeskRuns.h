@@ -53,6 +53,8 @@ public:
     UReportDoc *run(const ReportRecipe &recipe, QString &error);
     /// What the report in front was made of; null for one that no job made.
     const ReportRecipe *recipeInFront() const;
+    /// The same of any report.
+    const ReportRecipe *recipeOf(const UDocument *report) const;
     /// What there is to say of a report; null for one that no job made.
     const JobNotes *notesOf(const UDocument *report) const;
     /// The report has been closed.
