@@ -20,8 +20,6 @@
 #include <QAbstractItemView>
 #include <QFileDialog>
 #include <QFileInfo>
-#include <QLineEdit>
-#include <QListView>
 
 #include <algorithm>
 
@@ -101,6 +99,17 @@ bool mayReplace(const QString &path, const SaveRequest &request)
                         MessageButtons::YesNo, MessageIcon::Question}) == MessageAnswer::Yes;
 }
 
+/// Puts a name into the dialog. A file that has it is not selected: what is typed over the name would be added to it.
+void propose(QFileDialog &dialog, const QString &name)
+{
+    dialog.selectFile(name);
+    for (const QAbstractItemView *view : dialog.findChildren<QAbstractItemView *>()) {
+        if (view->selectionModel() != nullptr && view->objectName() == u"listView") {
+            view->selectionModel()->clearSelection();
+        }
+    }
+}
+
 /// Whenever another kind is chosen, the name in the dialog gets its ending.
 void followKind(QFileDialog &dialog, const QStringList &titles, const QStringList &patterns)
 {
@@ -108,24 +117,7 @@ void followKind(QFileDialog &dialog, const QStringList &titles, const QStringLis
         const QString name = dialog.selectedFiles().value(0);
         const QString other = withOtherEnding(name, patterns.value(titles.indexOf(title)), patterns);
         if (other != name && !QFileInfo(name).isDir()) {
-            dialog.selectFile(other);
-        }
-    });
-}
-
-/// What is typed counts: not a file that the dialog has selected because it has the name that was proposed.
-void letTextCount(const QFileDialog &dialog)
-{
-    const auto *field = dialog.findChild<QLineEdit *>(QStringLiteral("fileNameEdit"));
-    auto *list = dialog.findChild<QListView *>(QStringLiteral("listView"));
-    if (field == nullptr || list == nullptr) {
-        return; // the dialog is the system's
-    }
-    QObject::connect(field, &QLineEdit::textChanged, list, [list](const QString &text) {
-        const QModelIndexList rows = list->selectionModel()->selectedRows();
-        if (std::any_of(rows.begin(), rows.end(),
-                        [&text](const QModelIndex &row) { return row.data().toString() != text; })) {
-            list->selectionModel()->clearSelection();
+            propose(dialog, other);
         }
     });
 }
@@ -213,12 +205,11 @@ std::optional<SaveChoice> askSavePath(QWidget *parent, const SaveRequest &reques
         view->setContextMenuPolicy(Qt::NoContextMenu); // it would ask before it deletes a file
     }
     followKind(dialog, titles, patterns);
-    letTextCount(dialog);
     if (!request.fileName.isEmpty()) {
         if (QFileInfo(request.fileName).isAbsolute()) {
             dialog.setDirectory(QFileInfo(request.fileName).absolutePath());
         }
-        dialog.selectFile(QFileInfo(request.fileName).fileName());
+        propose(dialog, QFileInfo(request.fileName).fileName());
     }
     while (dialog.exec() == QDialog::Accepted) {
         const qsizetype chosen = titles.indexOf(dialog.selectedNameFilter());
