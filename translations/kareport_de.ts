@@ -44,6 +44,11 @@
         <translation>Der Speicher reicht dafür nicht aus</translation>
     </message>
     <message>
+        <location filename="../host/frame/PaneDock.cpp"/>
+        <source>%1, not saved</source>
+        <translation>%1, nicht gespeichert</translation>
+    </message>
+    <message>
         <location filename="../host/frame/UDocumentFiles.cpp"/>
         <source>Save changes to %1?</source>
         <translation>Änderungen an %1 speichern?</translation>
@@ -3250,11 +3255,6 @@
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>Open a job or a saved report, or drop it here.</source>
-        <translation>Auftrag oder gespeicherten Bericht öffnen oder hierher ziehen.</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>Open</source>
         <translation>Öffnen</translation>
     </message>
@@ -3267,20 +3267,6 @@
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>All files (*)</source>
         <translation>Alle Dateien (*)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>KaReport: fixed-pitch reports for civil engineering and surveying.
-
-Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and print it. Ctrl+F finds text, Ctrl+G goes to a page, Ctrl+wheel zooms.</source>
-        <translation>KaReport: Berichte in dicktengleicher Schrift für Tiefbau und Vermessung.
-
-Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.rep, .rtf) kann gelesen, bearbeitet und gedruckt werden. Strg+F sucht Text, Strg+G springt zu einer Seite, Strg+Mausrad ändert die Ansichtsgröße.</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>About KaReport</source>
-        <translation>Über KaReport</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
@@ -3312,6 +3298,11 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
+        <source>Exported to "%1".</source>
+        <translation>Exportiert nach „%1“.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
         <source>"%1" was changed by another program, and it has unsaved changes here. Load it again and lose the changes made here?</source>
         <translation>„%1“ wurde von einem anderen Programm geändert, und hier gibt es Änderungen, die nicht gespeichert sind. Neu laden und die hier gemachten Änderungen verwerfen?</translation>
     </message>
@@ -3322,13 +3313,68 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>Zoom &amp;In	Ctrl++</source>
+        <translation>&amp;Vergrößern	Ctrl++</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>Zoom &amp;Out	Ctrl+-</source>
+        <translation>Ver&amp;kleinern	Ctrl+-</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>&amp;Usual Size	Ctrl+0</source>
+        <translation>&amp;Normale Größe	Ctrl+0</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>All &amp;Commands...	Ctrl+Shift+P</source>
+        <translation>Alle &amp;Befehle...	Ctrl+Shift+P</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>&amp;Keep Report Windows</source>
+        <translation>Berichtsfenster &amp;behalten</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>Ne&amp;xt Report	Ctrl+Tab</source>
+        <translation>Nächster &amp;Bericht	Ctrl+Tab</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>Pre&amp;vious Report	Ctrl+Shift+Tab</source>
+        <translation>&amp;Voriger Bericht	Ctrl+Shift+Tab</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>New from &amp;Template...	Ctrl+T</source>
         <translation>Neu aus &amp;Vorlage...	Ctrl+T</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Export Values...	Ctrl+E</source>
-        <translation>Werte &amp;exportieren …	Ctrl+E</translation>
+        <source>Expo&amp;rt</source>
+        <translation>Expo&amp;rtieren</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>&amp;PDF...</source>
+        <translation>&amp;PDF...</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>&amp;Rich Text...</source>
+        <translation>&amp;Rich-Text...</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>Plain &amp;Text...</source>
+        <translation>Reiner &amp;Text...</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>&amp;Values...	Ctrl+E</source>
+        <translation>&amp;Werte...	Ctrl+E</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
@@ -3364,31 +3410,6 @@ Ein geöffneter Auftrag (.json) wird ausgeführt; ein gespeicherter Bericht (.re
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Pr&amp;eferences...	Ctrl+,</source>
         <translation>E&amp;instellungen...	Ctrl+,</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Zoom &amp;In	Ctrl++</source>
-        <translation>&amp;Vergrößern	Ctrl++</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Zoom &amp;Out	Ctrl+-</source>
-        <translation>Ver&amp;kleinern	Ctrl+-</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Usual Size	Ctrl+0</source>
-        <translation>&amp;Normale Größe	Ctrl+0</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Ne&amp;xt Report	Ctrl+Tab</source>
-        <translation>Nächster &amp;Bericht	Ctrl+Tab</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Pre&amp;vious Report	Ctrl+Shift+Tab</source>
-        <translation>&amp;Voriger Bericht	Ctrl+Shift+Tab</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
@@ -3708,6 +3729,16 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>&amp;Keep the report window when a job is done</source>
+        <translation>Das Berichtsfenster nach dem Lauf eines Auftrags &amp;behalten</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>Open at the &amp;start what was open at the end</source>
+        <translation>Beim &amp;Start öffnen, was am Ende offen war</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Preferences</source>
         <translation>Einstellungen</translation>
     </message>
@@ -3782,6 +3813,31 @@ Sollen sie wieder geöffnet werden?</translation>
         <translation>Pro&amp;gramm</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/ReportExport.cpp"/>
+        <source>PDF</source>
+        <translation>PDF</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/ReportExport.cpp"/>
+        <source>Rich Text</source>
+        <translation>Rich-Text</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/ReportExport.cpp"/>
+        <source>Plain Text</source>
+        <translation>Reiner Text</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/ReportExport.cpp"/>
+        <source>it is the report's own file, which is written by Save</source>
+        <translation>es ist die eigene Datei des Berichts, die mit „Speichern“ geschrieben wird</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/ReportExport.cpp"/>
+        <source>the report is empty, and a PDF has at least one page</source>
+        <translation>der Bericht ist leer, und eine PDF-Datei hat mindestens eine Seite</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
         <source>PDF with outline and page numbers (%1)</source>
         <translation>PDF mit Gliederung und Seitenzahlen (%1)</translation>
@@ -3800,11 +3856,6 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
         <source>There is a file "%1" already. Replace it?</source>
         <translation>Die Datei „%1“ gibt es schon. Ersetzen?</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/SaveAs.cpp"/>
-        <source>the report is empty, and a PDF has at least one page</source>
-        <translation>der Bericht ist leer, und eine PDF-Datei hat mindestens eine Seite</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
@@ -4192,6 +4243,236 @@ Sollen sie wieder geöffnet werden?</translation>
         <translation>N, E</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/commands/CommandList.cpp"/>
+        <source>Commands</source>
+        <translation>Befehle</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandList.cpp"/>
+        <source>Type a part of a command or of its keys</source>
+        <translation>Teil eines Befehls oder seiner Tasten eingeben</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandList.cpp"/>
+        <source>Find a command</source>
+        <translation>Befehl suchen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandList.cpp"/>
+        <source>Command</source>
+        <translation>Befehl</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandList.cpp"/>
+        <source>Keys</source>
+        <translation>Tasten</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandList.cpp"/>
+        <source>Why the command cannot be chosen</source>
+        <translation>Warum der Befehl nicht gewählt werden kann</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandList.cpp"/>
+        <source>No command is called so.</source>
+        <translation>Kein Befehl heißt so.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>No file has been opened yet.</source>
+        <translation>Es wurde noch keine Datei geöffnet.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>No report is open.</source>
+        <translation>Es ist kein Bericht offen.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>The report is still being made.</source>
+        <translation>Der Bericht wird noch erzeugt.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>No other report is open.</source>
+        <translation>Es ist kein anderer Bericht offen.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>There is only one window.</source>
+        <translation>Es gibt nur ein Fenster.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>The report has no changes that are not saved.</source>
+        <translation>Der Bericht hat keine ungespeicherten Änderungen.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>The report is open in another program. Close it there first.</source>
+        <translation>Der Bericht ist in einem anderen Programm offen. Schließen Sie ihn zuerst dort.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>This report was not made by a job, so its values are not known.</source>
+        <translation>Dieser Bericht stammt aus keinem Auftrag, daher sind seine Werte nicht bekannt.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>The report was not made from an object of another program.</source>
+        <translation>Der Bericht stammt nicht aus einem Objekt eines anderen Programms.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>The lines of a report window can only be read. Press View\Edit Report.</source>
+        <translation>Die Zeilen eines Berichtsfensters können nur gelesen werden. Drücken Sie „Bericht anzeigen/bearbeiten“.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>The report is still being loaded.</source>
+        <translation>Der Bericht wird noch geladen.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>There is nothing to undo.</source>
+        <translation>Es gibt nichts rückgängig zu machen.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>There is nothing to redo.</source>
+        <translation>Es gibt nichts zu wiederholen.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>No text is selected.</source>
+        <translation>Es ist kein Text markiert.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>The sheets are not shown. Choose View &gt; Sheets.</source>
+        <translation>Die Blätter werden nicht gezeigt. Wählen Sie Ansicht &gt; Blätter.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/AboutDialog.cpp"/>
+        <source>Built as %1 with %2 for %3, Qt %4.</source>
+        <translation>Gebaut als %1 mit %2 für %3, Qt %4.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/AboutDialog.cpp"/>
+        <source>About KaReport</source>
+        <translation>Über KaReport</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/AboutDialog.cpp"/>
+        <source>The program's icon</source>
+        <translation>Das Symbol des Programms</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/AboutDialog.cpp"/>
+        <source>Version %1</source>
+        <translation>Version %1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/AboutDialog.cpp"/>
+        <source>Fixed-pitch reports for civil engineering and surveying.</source>
+        <translation>Berichte in fester Zeichenbreite für Tiefbau und Vermessung.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/AboutDialog.cpp"/>
+        <source>Qt is used under the LGPL, version 3. All libraries and their licences are listed under Licences.</source>
+        <translation>Qt wird unter der LGPL, Version 3, verwendet. Alle Bibliotheken und ihre Lizenzen stehen unter „Lizenzen“.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/AboutDialog.cpp"/>
+        <source>&amp;Licences</source>
+        <translation>&amp;Lizenzen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>Working with KaReport</source>
+        <translation>Arbeiten mit KaReport</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>Templates</source>
+        <translation>Vorlagen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>Data</source>
+        <translation>Daten</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>LandXML</source>
+        <translation>LandXML</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>Lists of LandXML files</source>
+        <translation>Listen aus LandXML-Dateien</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>Groups and totals</source>
+        <translation>Gruppen und Summen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>The job file</source>
+        <translation>Die Auftragsdatei</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>The command line</source>
+        <translation>Die Kommandozeile</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>Many jobs</source>
+        <translation>Viele Aufträge</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>Examples</source>
+        <translation>Beispiele</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>Licences</source>
+        <translation>Lizenzen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/HelpWindow.cpp"/>
+        <source>Guide</source>
+        <translation>Handbuch</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/HelpWindow.cpp"/>
+        <source>Back</source>
+        <translation>Zurück</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/HelpWindow.cpp"/>
+        <source>Forward</source>
+        <translation>Vor</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/HelpWindow.cpp"/>
+        <source>Find on this page</source>
+        <translation>Auf dieser Seite suchen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/HelpWindow.cpp"/>
+        <source>Pages of the guide</source>
+        <translation>Seiten des Handbuchs</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/HelpWindow.cpp"/>
+        <source>Not on this page</source>
+        <translation>Nicht auf dieser Seite</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
         <source>(not read)</source>
         <translation>(nicht gelesen)</translation>
@@ -4428,8 +4709,8 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
-        <source>&amp;Go to Notes	F8</source>
-        <translation>&amp;Zu den Hinweisen	F8</translation>
+        <source>&amp;Go to Notes	F4</source>
+        <translation>&amp;Zu den Hinweisen	F4</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
@@ -4561,6 +4842,41 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/run/UnitsBar.cpp"/>
         <source>Units</source>
         <translation>Einheiten</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/start/StartPage.cpp"/>
+        <source>%1 — not there</source>
+        <translation>%1 — nicht vorhanden</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/start/StartPage.cpp"/>
+        <source>Start</source>
+        <translation>Start</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/start/StartPage.cpp"/>
+        <source>Recent files</source>
+        <translation>Zuletzt benutzte Dateien</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/start/StartPage.cpp"/>
+        <source>Files that you open are listed here.</source>
+        <translation>Hier stehen die Dateien, die Sie öffnen.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/start/StartPage.cpp"/>
+        <source>Start page</source>
+        <translation>Startseite</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/start/StartPage.cpp"/>
+        <source>Open a job or a saved report, or drop a file here.</source>
+        <translation>Öffnen Sie einen Auftrag oder einen gespeicherten Bericht, oder legen Sie eine Datei hier ab.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/start/StartPage.cpp"/>
+        <source>Recent Files</source>
+        <translation>Zuletzt benutzt</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>

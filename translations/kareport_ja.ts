@@ -44,6 +44,11 @@
         <translation>メモリが足りません</translation>
     </message>
     <message>
+        <location filename="../host/frame/PaneDock.cpp"/>
+        <source>%1, not saved</source>
+        <translation>%1、未保存</translation>
+    </message>
+    <message>
         <location filename="../host/frame/UDocumentFiles.cpp"/>
         <source>Save changes to %1?</source>
         <translation>%1 への変更を保存しますか?</translation>
@@ -3250,11 +3255,6 @@
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>Open a job or a saved report, or drop it here.</source>
-        <translation>ジョブまたは保存した帳票を開くか、ここにドロップしてください。</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>Open</source>
         <translation>開く</translation>
     </message>
@@ -3267,20 +3267,6 @@
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>All files (*)</source>
         <translation>すべてのファイル (*)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>KaReport: fixed-pitch reports for civil engineering and surveying.
-
-Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and print it. Ctrl+F finds text, Ctrl+G goes to a page, Ctrl+wheel zooms.</source>
-        <translation>KaReport: 土木・測量のための等幅帳票。
-
-ジョブ (.json) を開くと実行されます。保存した帳票 (.rep, .rtf) を開くと、閲覧、編集、印刷ができます。Ctrl+F で検索、Ctrl+G でページへ移動、Ctrl+ホイールで拡大/縮小します。</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
-        <source>About KaReport</source>
-        <translation>KaReport について</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
@@ -3312,6 +3298,11 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
+        <source>Exported to "%1".</source>
+        <translation>「%1」に書き出しました。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
         <source>"%1" was changed by another program, and it has unsaved changes here. Load it again and lose the changes made here?</source>
         <translation>「%1」は別のプログラムで変更されましたが、ここにも未保存の変更があります。再読み込みして、ここでの変更を破棄しますか?</translation>
     </message>
@@ -3322,13 +3313,68 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>Zoom &amp;In	Ctrl++</source>
+        <translation>拡大(&amp;I)	Ctrl++</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>Zoom &amp;Out	Ctrl+-</source>
+        <translation>縮小(&amp;O)	Ctrl+-</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>&amp;Usual Size	Ctrl+0</source>
+        <translation>標準サイズ(&amp;U)	Ctrl+0</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>All &amp;Commands...	Ctrl+Shift+P</source>
+        <translation>すべてのコマンド(&amp;C)...	Ctrl+Shift+P</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>&amp;Keep Report Windows</source>
+        <translation>帳票ウィンドウを残す(&amp;K)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>Ne&amp;xt Report	Ctrl+Tab</source>
+        <translation>次のレポート(&amp;X)	Ctrl+Tab</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>Pre&amp;vious Report	Ctrl+Shift+Tab</source>
+        <translation>前のレポート(&amp;V)	Ctrl+Shift+Tab</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>New from &amp;Template...	Ctrl+T</source>
         <translation>テンプレートから新規作成(&amp;T)...	Ctrl+T</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Export Values...	Ctrl+E</source>
-        <translation>値のエクスポート(&amp;E)...	Ctrl+E</translation>
+        <source>Expo&amp;rt</source>
+        <translation>書き出し(&amp;R)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>&amp;PDF...</source>
+        <translation>PDF(&amp;P)...</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>&amp;Rich Text...</source>
+        <translation>リッチテキスト(&amp;R)...</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>Plain &amp;Text...</source>
+        <translation>テキスト(&amp;T)...</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
+        <source>&amp;Values...	Ctrl+E</source>
+        <translation>値(&amp;V)...	Ctrl+E</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
@@ -3364,31 +3410,6 @@ Open a job (.json) to run it, or a saved report (.rep, .rtf) to read, edit and p
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
         <source>Pr&amp;eferences...	Ctrl+,</source>
         <translation>設定(&amp;E)...	Ctrl+,</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Zoom &amp;In	Ctrl++</source>
-        <translation>拡大(&amp;I)	Ctrl++</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Zoom &amp;Out	Ctrl+-</source>
-        <translation>縮小(&amp;O)	Ctrl+-</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>&amp;Usual Size	Ctrl+0</source>
-        <translation>標準サイズ(&amp;U)	Ctrl+0</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Ne&amp;xt Report	Ctrl+Tab</source>
-        <translation>次のレポート(&amp;X)	Ctrl+Tab</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
-        <source>Pre&amp;vious Report	Ctrl+Shift+Tab</source>
-        <translation>前のレポート(&amp;V)	Ctrl+Shift+Tab</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
@@ -3708,6 +3729,16 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>&amp;Keep the report window when a job is done</source>
+        <translation>ジョブの終了後も帳票ウィンドウを残す(&amp;K)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>Open at the &amp;start what was open at the end</source>
+        <translation>前回終了時に開いていたものを起動時に開く(&amp;S)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Preferences</source>
         <translation>設定</translation>
     </message>
@@ -3782,6 +3813,31 @@ Open them again?</source>
         <translation>プログラム(&amp;G)</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/ReportExport.cpp"/>
+        <source>PDF</source>
+        <translation>PDF</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/ReportExport.cpp"/>
+        <source>Rich Text</source>
+        <translation>リッチテキスト</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/ReportExport.cpp"/>
+        <source>Plain Text</source>
+        <translation>テキスト</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/ReportExport.cpp"/>
+        <source>it is the report's own file, which is written by Save</source>
+        <translation>この帳票自身のファイルです。「保存」で書き込みます</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/ReportExport.cpp"/>
+        <source>the report is empty, and a PDF has at least one page</source>
+        <translation>レポートが空です。PDFには少なくとも1ページ必要です</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
         <source>PDF with outline and page numbers (%1)</source>
         <translation>しおりとページ番号付きの PDF (%1)</translation>
@@ -3800,11 +3856,6 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
         <source>There is a file "%1" already. Replace it?</source>
         <translation>ファイル「%1」は既にあります。置き換えますか?</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/SaveAs.cpp"/>
-        <source>the report is empty, and a PDF has at least one page</source>
-        <translation>レポートが空です。PDFには少なくとも1ページ必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
@@ -4192,6 +4243,236 @@ Open them again?</source>
         <translation>N, E</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/commands/CommandList.cpp"/>
+        <source>Commands</source>
+        <translation>コマンド</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandList.cpp"/>
+        <source>Type a part of a command or of its keys</source>
+        <translation>コマンドまたはキーの一部を入力</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandList.cpp"/>
+        <source>Find a command</source>
+        <translation>コマンドを検索</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandList.cpp"/>
+        <source>Command</source>
+        <translation>コマンド</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandList.cpp"/>
+        <source>Keys</source>
+        <translation>キー</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandList.cpp"/>
+        <source>Why the command cannot be chosen</source>
+        <translation>コマンドを選べない理由</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandList.cpp"/>
+        <source>No command is called so.</source>
+        <translation>該当するコマンドはありません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>No file has been opened yet.</source>
+        <translation>まだファイルを開いていません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>No report is open.</source>
+        <translation>開いている帳票がありません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>The report is still being made.</source>
+        <translation>帳票を作成中です。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>No other report is open.</source>
+        <translation>ほかに開いている帳票がありません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>There is only one window.</source>
+        <translation>ウィンドウは一つだけです。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>The report has no changes that are not saved.</source>
+        <translation>未保存の変更はありません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>The report is open in another program. Close it there first.</source>
+        <translation>帳票は別のプログラムで開かれています。先にそちらで閉じてください。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>This report was not made by a job, so its values are not known.</source>
+        <translation>この帳票はジョブで作成されていないため、値がわかりません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>The report was not made from an object of another program.</source>
+        <translation>帳票は別のプログラムのオブジェクトから作成されたものではありません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>The lines of a report window can only be read. Press View\Edit Report.</source>
+        <translation>帳票ウィンドウの行は読むことしかできません。「帳票の表示/編集」を押してください。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>The report is still being loaded.</source>
+        <translation>帳票を読み込み中です。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>There is nothing to undo.</source>
+        <translation>元に戻す操作はありません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>There is nothing to redo.</source>
+        <translation>やり直す操作はありません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>No text is selected.</source>
+        <translation>テキストが選択されていません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>The sheets are not shown. Choose View &gt; Sheets.</source>
+        <translation>用紙は表示されていません。「表示」&gt;「用紙」を選んでください。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/AboutDialog.cpp"/>
+        <source>Built as %1 with %2 for %3, Qt %4.</source>
+        <translation>%1 として %2 で %3 向けにビルド、Qt %4。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/AboutDialog.cpp"/>
+        <source>About KaReport</source>
+        <translation>KaReport について</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/AboutDialog.cpp"/>
+        <source>The program's icon</source>
+        <translation>プログラムのアイコン</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/AboutDialog.cpp"/>
+        <source>Version %1</source>
+        <translation>バージョン %1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/AboutDialog.cpp"/>
+        <source>Fixed-pitch reports for civil engineering and surveying.</source>
+        <translation>土木・測量のための等幅帳票。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/AboutDialog.cpp"/>
+        <source>Qt is used under the LGPL, version 3. All libraries and their licences are listed under Licences.</source>
+        <translation>Qt は LGPL バージョン 3 に基づいて使用しています。すべてのライブラリとライセンスは「ライセンス」にあります。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/AboutDialog.cpp"/>
+        <source>&amp;Licences</source>
+        <translation>ライセンス(&amp;L)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>Working with KaReport</source>
+        <translation>KaReport の使い方</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>Templates</source>
+        <translation>テンプレート</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>Data</source>
+        <translation>データ</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>LandXML</source>
+        <translation>LandXML</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>Lists of LandXML files</source>
+        <translation>LandXML ファイルの一覧表</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>Groups and totals</source>
+        <translation>グループと合計</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>The job file</source>
+        <translation>ジョブファイル</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>The command line</source>
+        <translation>コマンドライン</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>Many jobs</source>
+        <translation>多数のジョブ</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>Examples</source>
+        <translation>例</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
+        <source>Licences</source>
+        <translation>ライセンス</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/HelpWindow.cpp"/>
+        <source>Guide</source>
+        <translation>手引き</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/HelpWindow.cpp"/>
+        <source>Back</source>
+        <translation>戻る</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/HelpWindow.cpp"/>
+        <source>Forward</source>
+        <translation>進む</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/HelpWindow.cpp"/>
+        <source>Find on this page</source>
+        <translation>このページを検索</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/HelpWindow.cpp"/>
+        <source>Pages of the guide</source>
+        <translation>手引きのページ</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/help/HelpWindow.cpp"/>
+        <source>Not on this page</source>
+        <translation>このページにはありません</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
         <source>(not read)</source>
         <translation>(読み込まない)</translation>
@@ -4428,8 +4709,8 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
-        <source>&amp;Go to Notes	F8</source>
-        <translation>注意へ移動(&amp;G)	F8</translation>
+        <source>&amp;Go to Notes	F4</source>
+        <translation>注意へ移動(&amp;G)	F4</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
@@ -4561,6 +4842,41 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/run/UnitsBar.cpp"/>
         <source>Units</source>
         <translation>単位</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/start/StartPage.cpp"/>
+        <source>%1 — not there</source>
+        <translation>%1 — 見つかりません</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/start/StartPage.cpp"/>
+        <source>Start</source>
+        <translation>開始</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/start/StartPage.cpp"/>
+        <source>Recent files</source>
+        <translation>最近使ったファイル</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/start/StartPage.cpp"/>
+        <source>Files that you open are listed here.</source>
+        <translation>開いたファイルがここに表示されます。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/start/StartPage.cpp"/>
+        <source>Start page</source>
+        <translation>スタートページ</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/start/StartPage.cpp"/>
+        <source>Open a job or a saved report, or drop a file here.</source>
+        <translation>ジョブまたは保存した帳票を開くか、ここにファイルをドロップしてください。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/start/StartPage.cpp"/>
+        <source>Recent Files</source>
+        <translation>最近使ったファイル</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>

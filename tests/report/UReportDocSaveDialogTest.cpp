@@ -301,7 +301,8 @@ TEST(UReportDocSaveDialog, AFailedSaveIsSaidOnlyWhereTheHostHasInstalledIt)
         QStringList said;
         if (isInstalled) {
             kareport::setSaveFailure([&said](const QString &path, const QString &reason) {
-                said.append(QFileInfo(path).fileName() + u' ' + (reason.isEmpty() ? u"unknown" : u"known"));
+                said.append(QFileInfo(path).fileName() +
+                            (reason.isEmpty() ? QStringLiteral(" unknown") : QStringLiteral(" known")));
             });
         }
         UReportDoc report;

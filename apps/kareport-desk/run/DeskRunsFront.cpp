@@ -59,7 +59,7 @@ void DeskRuns::addTo(const ReportMenu &menu)
     frame_.AddCommand(*menu.view, viewUnitsBarCommand, Xlate("U&nits Bar"))->setCheckable(true);
     frame_.AddCommand(*menu.view, chooseUnitsCommand, Xlate("&Choose Units\tCtrl+U"));
     frame_.AddCommand(*menu.view, viewNotesCommand, Xlate("N&otes"))->setCheckable(true);
-    frame_.AddCommand(*menu.view, goToNotesCommand, Xlate("&Go to Notes\tF8"));
+    frame_.AddCommand(*menu.view, goToNotesCommand, Xlate("&Go to Notes\tF4"));
 }
 
 NotesPane &DeskRuns::notesPane()
