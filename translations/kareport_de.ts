@@ -4319,6 +4319,11 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>This report was not made by a job.</source>
+        <translation>Dieser Bericht stammt aus keinem Auftrag.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
         <source>The report was not made from an object of another program.</source>
         <translation>Der Bericht stammt nicht aus einem Objekt eines anderen Programms.</translation>
     </message>

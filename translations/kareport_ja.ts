@@ -4319,6 +4319,11 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
+        <source>This report was not made by a job.</source>
+        <translation>この帳票はジョブで作成されていません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/commands/CommandReasons.cpp"/>
         <source>The report was not made from an object of another program.</source>
         <translation>帳票は別のプログラムのオブジェクトから作成されたものではありません。</translation>
     </message>

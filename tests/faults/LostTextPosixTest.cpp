@@ -2,6 +2,7 @@
 
 #include "DeskFixture.h"
 #include "JobOutputs.h"
+#include "ReportSaveName.h"
 #include "ReportTextCodec.h"
 #include "ReportWindowEntry.h"
 #include "SaveAs.h"
@@ -59,6 +60,7 @@ TEST(LostText, IsSavedUnderNoName)
         {"a.pdf", {}, "a PDF"},
     };
     const Surroundings around;
+    kareport::setSaveFailure(kareport::sayNotSaved); // as a host that wants it
     for (const Row &row : rows) {
         for (const Left left : losses) {
             for (const bool isThere : {true, false}) {
@@ -90,6 +92,7 @@ TEST(LostText, IsSavedUnderNoName)
             }
         }
     }
+    kareport::setSaveFailure({});
 }
 
 TEST(LostText, IsWrittenNowhere)

@@ -1,5 +1,7 @@
 #include "ReportWindowFixture.h"
 
+#include "ReportSaveName.h"
+
 WindowDesk::WindowDesk()
 {
     application.emplace();
@@ -46,8 +48,15 @@ QStringList WindowDesk::rowsOf(const UReportWindowDlg &window)
     return rows;
 }
 
+AnsweredSaving::~AnsweredSaving()
+{
+    kareport::setSaveDialog({});
+    kareport::setSaveFailure({});
+}
+
 AnsweredSaving::AnsweredSaving(std::optional<QString> path)
 {
+    kareport::setSaveFailure(kareport::sayNotSaved);
     kareport::setSaveDialog([this, path](const kareport::SaveRequest &request) {
         requests.push_back(request);
         if (meanwhile) {

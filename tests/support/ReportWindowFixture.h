@@ -55,7 +55,7 @@ class AnsweredSaving
 {
 public:
     explicit AnsweredSaving(std::optional<QString> path);
-    ~AnsweredSaving() { kareport::setSaveDialog({}); }
+    ~AnsweredSaving();
     AnsweredSaving(const AnsweredSaving &) = delete;
     AnsweredSaving &operator=(const AnsweredSaving &) = delete;
 

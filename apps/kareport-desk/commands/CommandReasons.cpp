@@ -118,6 +118,9 @@ QString whyDisabled(unsigned command, const DeskState &state)
     case fileCloseCommand:
         return state.isHeldByEditor ? Xlate("The report is open in another program. Close it there first.") : QString();
     case fileExportCommand: return Xlate("This report was not made by a job, so its values are not known.");
+    case runAgainCommand:
+    case saveAsJobCommand:
+    case chooseUnitsCommand: return Xlate("This report was not made by a job.");
     case updateTextCommand: return Xlate("The report was not made from an object of another program.");
     default: break;
     }
