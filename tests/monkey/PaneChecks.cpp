@@ -9,6 +9,7 @@
 #include <QApplication>
 #include <QDockWidget>
 #include <QTabBar>
+#include <QToolBar>
 
 #include <algorithm>
 
@@ -76,7 +77,18 @@ QString World::checkActive() const
     });
     const auto *tabs = qobject_cast<const QTabBar *>(focus);
     const bool isInTabs = mayBeInTabs_ && tabs != nullptr && tabs->count() > 1 && !tabs->visibleRegion().isEmpty();
-    if (hasPanes && !isInTabs && (dock == nullptr || focus == nullptr || !dock->isAncestorOf(focus))) {
+    // The frame's own parts, the notes and the bars, take the keyboard while the report beside them stays the active one.
+    const bool isInFrame = focus != nullptr && std::any_of(docks.begin(), docks.end(), [focus](const QDockWidget *own) {
+                               return dynamic_cast<const kareport::PaneDock *>(own) == nullptr && own->isVisible() &&
+                                      own->isAncestorOf(focus);
+                           });
+    const QList<QToolBar *> bars = frame_->findChildren<QToolBar *>();
+    const bool isInBar = std::any_of(bars.begin(), bars.end(), [focus](const QToolBar *bar) {
+        return focus != nullptr && bar->isVisible() && bar->isAncestorOf(focus);
+    });
+    if (hasPanes && !isInTabs && !isInFrame && !isInBar &&
+        (dock == nullptr || focus == nullptr || !dock->isAncestorOf(focus)))
+    {
         return QStringLiteral("the keyboard is not in the active pane");
     }
     if (typedInto != nullptr && frame_->GetCommandDocument() != typedInto->GetDocument()) {
