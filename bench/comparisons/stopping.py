@@ -13,8 +13,10 @@ RUNS = 10
 
 def seconds_to_end(arguments, folder, after):
     """Seconds from the signal to the end of a program that has worked for a while; nothing where it had ended before."""
+    # A shell's job in the background ignores SIGINT, and so would what it starts.
     process = subprocess.Popen(arguments, cwd=folder, stdin=subprocess.DEVNULL, stdout=subprocess.DEVNULL,
-                               stderr=subprocess.DEVNULL)
+                               stderr=subprocess.DEVNULL,
+                               preexec_fn=lambda: signal.signal(signal.SIGINT, signal.SIG_DFL))
     time.sleep(after)
     begin = time.perf_counter()
     process.send_signal(signal.SIGINT)
