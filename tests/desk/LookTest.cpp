@@ -5,9 +5,12 @@
 
 #include <QApplication>
 #include <QFile>
+#include <QStyle>
 #include <QStyleFactory>
 
 #include <gtest/gtest.h>
+
+#include <memory>
 
 namespace
 {
@@ -42,7 +45,7 @@ TEST(Look, EveryTextHasTheContrastThatIsRequired)
                               {QPalette::PlaceholderText, QPalette::Base, "placeholder"},
                               {QPalette::Link, QPalette::Base, "link"},
                               {QPalette::LinkVisited, QPalette::Base, "visited link"}};
-    const QPalette light = QStyleFactory::create(QStringLiteral("Fusion"))->standardPalette();
+    const QPalette light = std::unique_ptr<QStyle>(QStyleFactory::create(QStringLiteral("Fusion")))->standardPalette();
     for (const QPalette &given : {light, darkPalette(), QPalette(Qt::gray), QPalette(Qt::darkBlue)}) {
         const QPalette palette = readablePalette(given);
         for (const auto group : {QPalette::Active, QPalette::Inactive}) {

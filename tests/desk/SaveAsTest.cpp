@@ -371,7 +371,8 @@ TEST(SaveAs, AFileThatIsOpenAsAnotherReportIsNotReplaced)
     ASSERT_EQ(desk.messages.size(), 2);
     EXPECT_TRUE(desk.messages[0].contains(QStringLiteral("is open as another report")))
         << desk.messages[0].toStdString();
-    EXPECT_TRUE(desk.messages[1].contains(QStringLiteral("is open as another report"))) << "by whatever name";
+    EXPECT_TRUE(desk.messages[1].contains(QStringLiteral("is open as another report")))
+        << "by whatever name: " << desk.messages[1].toStdString();
     EXPECT_EQ(folder.bytesOf("other.rep"), content);
     EXPECT_EQ(report->GetPathName(), folder.path("mine.rep"));
 

@@ -129,7 +129,7 @@ TEST(LandXmlData, WhatATableDoesNotShowIsNotNoted)
     ASSERT_EQ(job.notes.said().size(), 2U);
     EXPECT_TRUE(job.notes.said()[0].message().endsWith(
         u"road.xml:3:3: note: the tangents of the element are parallel: it has no PI"));
-    const kareport::JobNote &missing = job.notes.said()[1];
+    const kareport::JobNote missing = job.notes.said()[1];
     EXPECT_EQ(missing.kind, kareport::JobNote::Kind::MissingValue);
     EXPECT_TRUE(missing.dataFile.endsWith(u"road.xml")) << "the place of a value is that of its element";
     ASSERT_TRUE(missing.dataPlace);

@@ -16,6 +16,7 @@
 #include "Xlate.h"
 
 #include <QApplication>
+#include <QDir>
 #include <QFileInfo>
 #include <QStatusBar>
 #include <QToolButton>
