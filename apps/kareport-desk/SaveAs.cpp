@@ -18,10 +18,8 @@
 #include "Xlate.h"
 
 #include <QAbstractItemView>
-#include <QDir>
 #include <QFileDialog>
 #include <QFileInfo>
-#include <QLineEdit>
 
 #include <algorithm>
 
@@ -112,21 +110,11 @@ void propose(QFileDialog &dialog, const QString &name)
     }
 }
 
-/// The file that the dialog names. What stands in its field counts: a file that it has selected because it has the name
-/// that was proposed may not be what has been typed since.
-QString namedFile(const QFileDialog &dialog)
-{
-    const auto *field = dialog.findChild<QLineEdit *>(QStringLiteral("fileNameEdit"));
-    const QString text = field != nullptr ? field->text() : QString();
-    const bool isPlain = !text.isEmpty() && !text.startsWith(u'~') && !text.contains(u'"');
-    return isPlain ? QDir::cleanPath(dialog.directory().absoluteFilePath(text)) : dialog.selectedFiles().value(0);
-}
-
 /// Whenever another kind is chosen, the name in the dialog gets its ending.
 void followKind(QFileDialog &dialog, const QStringList &titles, const QStringList &patterns)
 {
     QObject::connect(&dialog, &QFileDialog::filterSelected, &dialog, [&dialog, titles, patterns](const QString &title) {
-        const QString name = namedFile(dialog);
+        const QString name = dialog.selectedFiles().value(0);
         const QString other = withOtherEnding(name, patterns.value(titles.indexOf(title)), patterns);
         if (other != name && !QFileInfo(name).isDir()) {
             propose(dialog, other);
@@ -225,12 +213,10 @@ std::optional<SaveChoice> askSavePath(QWidget *parent, const SaveRequest &reques
     }
     while (dialog.exec() == QDialog::Accepted) {
         const qsizetype chosen = titles.indexOf(dialog.selectedNameFilter());
-        QString path = withEndingOf(namedFile(dialog), patterns.value(chosen), patterns);
+        QString path = withEndingOf(dialog.selectedFiles().value(0), patterns.value(chosen), patterns);
         if (hasFolder(path, request) && mayReplace(path, request)) {
             return SaveChoice(path, chosen >= 0 && kinds[static_cast<std::size_t>(chosen)].hasOutline);
         }
-        // Shown again, the dialog stands where the name that was refused is, so that a name alone means one beside it.
-        dialog.setDirectory(QFileInfo(path).absolutePath());
     }
     return std::nullopt;
 }
