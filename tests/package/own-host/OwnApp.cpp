@@ -134,4 +134,6 @@ std::optional<QString> askSaveName(const SaveRequest & /*request*/)
     return std::nullopt;
 }
 
+void saySaveFailed(const QString & /*path*/, const QString & /*reason*/) {}
+
 } // namespace kareport

@@ -302,6 +302,12 @@ QAction *UXTPMDIFrameWnd::AddCommand(QMenu & /*menu*/, unsigned /*id*/, const QS
 
 void UXTPMDIFrameWnd::DockPane(COneViewPane & /*pane*/) {}
 void UXTPMDIFrameWnd::SettlePanes() {}
+void UXTPMDIFrameWnd::UpdateCommands() {}
+
+bool UXTPMDIFrameWnd::CanAct(unsigned /*command*/) const
+{
+    return true;
+}
 
 bool UXTPMDIFrameWnd::event(QEvent *event)
 {
