@@ -4479,11 +4479,6 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
-        <source>(not read)</source>
-        <translation>(nicht gelesen)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
         <source>Comma</source>
         <translation>Komma</translation>
     </message>
@@ -4638,7 +4633,12 @@ Sollen sie wieder geöffnet werden?</translation>
         <translation>Zeile %1, Spalte %2: %3</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportPanelRows.cpp"/>
+        <source>(not read)</source>
+        <translation>(nicht gelesen)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanelRows.cpp"/>
         <source>Variable of the column %1</source>
         <translation>Variable der Spalte %1</translation>
     </message>

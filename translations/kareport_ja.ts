@@ -4479,11 +4479,6 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
-        <source>(not read)</source>
-        <translation>(読み込まない)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
         <source>Comma</source>
         <translation>コンマ</translation>
     </message>
@@ -4638,7 +4633,12 @@ Open them again?</source>
         <translation>%1 行 %2 列: %3</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportPanelRows.cpp"/>
+        <source>(not read)</source>
+        <translation>(読み込まない)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanelRows.cpp"/>
         <source>Variable of the column %1</source>
         <translation>列 %1 の変数</translation>
     </message>
