@@ -58,7 +58,7 @@ QPalette readablePalette(const QPalette &palette)
             }
             readable.setColor(group, pair.text, readableOn(text, background));
         }
-        // Selected text keeps its colour, which is white in most palettes: what is behind it changes.
+        // Selected text keeps its colour, which is white in most palettes: its background changes instead.
         const QColor selected = palette.color(group, QPalette::HighlightedText);
         readable.setColor(group, QPalette::Highlight, readableOn(palette.color(group, QPalette::Highlight), selected));
     }
