@@ -24,6 +24,6 @@ bool isPdfName(QStringView name);
 /// @return nothing when the user has cancelled
 std::optional<QString> askReportName(UDocument &document, bool richTextFirst);
 /// Says in a message that a report could not be saved, and why, for a host that wants it. @param reason  empty when it is not known: what to do is said then
-void sayNotSaved(const QString &path, const QString &reason = QString());
+void sayNotSaved(const QString &path, const QString &reason);
 
 } // namespace kareport

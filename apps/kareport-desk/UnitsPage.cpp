@@ -6,11 +6,11 @@
 #include "UFormatAngle.h"
 #include "UFormatBearing.h"
 #include "UnitFactors.h"
+#include "ValueBoxes.h"
 #include "VariableType.h"
 #include "Xlate.h"
 
 #include <QCheckBox>
-#include <QComboBox>
 #include <QFontDatabase>
 #include <QFormLayout>
 #include <QGroupBox>
@@ -18,12 +18,9 @@
 #include <QLabel>
 #include <QLineEdit>
 #include <QRegularExpressionValidator>
-#include <QSpinBox>
 
-#include <initializer_list>
 #include <numbers>
 #include <type_traits>
-#include <utility>
 
 namespace kareport
 {
@@ -31,7 +28,6 @@ namespace kareport
 namespace
 {
 
-constexpr int mostDecimals = 15;
 constexpr int mostBearingDecimals = 9;
 
 // Values whose digits show what decimals, zeros and units do to them.
@@ -41,29 +37,17 @@ constexpr double sampleArea = 25600.5;                                          
 constexpr double sampleAngle = (7 + 5 / 60.0) * std::numbers::pi / 180;                     // 7°05'
 constexpr double sampleBearing = (135 + 4 / 60.0 + 9.25 / 3600.0) * std::numbers::pi / 180; // 135°04'09.25"
 
-/// A list of choices, each with the value that it means.
 template <typename Value>
 QComboBox *choice(Value current, std::initializer_list<std::pair<std::type_identity_t<Value>, QString>> items)
 {
-    auto *box = new QComboBox;
-    for (const auto &[value, text] : items) {
-        box->addItem(text, static_cast<int>(value));
-    }
-    box->setCurrentIndex(box->findData(static_cast<int>(current)));
+    QComboBox *box = choice<Value>(items);
+    display(*box, current);
     return box;
-}
-
-/// The value that was chosen.
-template <typename Value>
-Value chosenIn(const QComboBox &box)
-{
-    return static_cast<Value>(box.currentData().toInt());
 }
 
 QSpinBox *decimals(int value, int most)
 {
-    auto *box = new QSpinBox;
-    box->setRange(0, most);
+    QSpinBox *box = decimals(most);
     box->setValue(value);
     return box;
 }

@@ -97,19 +97,6 @@ TEST(SheetLayout, AnEmptyTextHasNoSheet)
     EXPECT_EQ(flowing.sheetAt(0), -1);
 }
 
-/// A picture of the dots of a sheet, with what a painter draws on it.
-QImage dots(const std::function<void(QPainter &)> &draw)
-{
-    QImage image(2600, 2200, QImage::Format_Grayscale8);
-    image.setDotsPerMeterX(23622);
-    image.setDotsPerMeterY(23622);
-    image.fill(Qt::white);
-    QPainter painter(&image);
-    draw(painter);
-    painter.end();
-    return image;
-}
-
 TEST(SheetLayout, DrawsWhatAJobDraws)
 {
     struct Row
@@ -132,15 +119,15 @@ TEST(SheetLayout, DrawsWhatAJobDraws)
         SheetLayout layout(text.document(), paperFor(room), row.given ? pagesOf(text.document(), 20) : nothing);
         finish(layout);
         ASSERT_EQ(layout.count(), 1);
-        const QImage shown = dots([&](QPainter &painter) { layout.draw(painter, 0); });
+        const QImage shown = sheetImage(QSize(2600, 2200), [&](QPainter &painter) { layout.draw(painter, 0); });
         const PrintSheet sheet = layout.sheets().front();
-        const QImage printed = dots([&](QPainter &painter) {
+        const QImage printed = sheetImage(QSize(2600, 2200), [&](QPainter &painter) {
             kareport::LinePager pager(text.document(), *painter.device());
             row.given ? pager.layOutScaled(room, sheet.start, sheet.stop, sheet.scale, &painter)
                       : pager.layOut(room, sheet.start, -1, &painter);
         });
         EXPECT_EQ(shown, printed);
-        EXPECT_NE(shown, dots([](QPainter &) {})) << "something is drawn";
+        EXPECT_NE(shown, sheetImage(QSize(2600, 2200), [](QPainter &) {})) << "something is drawn";
     }
 }
 
@@ -183,7 +170,7 @@ TEST(SheetLayout, ARowIsWhereItsCharactersAreDrawn)
         SheetLayout layout(text.document(), paperFor(PagedText::room(20, isGiven ? 40 : 60)),
                            isGiven ? pagesOf(text.document(), 20) : nothing);
         finish(layout);
-        const QImage image = dots([&](QPainter &painter) { layout.draw(painter, 0); });
+        const QImage image = sheetImage(QSize(2600, 2200), [&](QPainter &painter) { layout.draw(painter, 0); });
         const PageRow row = layout.rows(0).at(1);
         QRect ink;
         for (int y = 0; y < image.height(); ++y) {

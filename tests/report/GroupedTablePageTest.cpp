@@ -1,5 +1,6 @@
 #include "DataReport.h"
 #include "GroupedList.h"
+#include "PlainGroupText.h"
 #include "RandomRuns.h"
 #include "RandomSequence.h"
 
@@ -12,15 +13,6 @@ namespace
 {
 
 using namespace kareport;
-
-GroupText plainText(const QString &text)
-{
-    GroupText made;
-    GroupText::Piece piece;
-    piece.text = text;
-    made.pieces.push_back(piece);
-    return made;
-}
 
 /// Rows in groups of given sizes.
 class GroupedObjects : public UDataObjectList, public GroupedList

@@ -1,6 +1,7 @@
 // The sheets on the screen are those that are printed, and those of the PDF.
 #include "SheetReport.h"
 
+#include "PagedText.h"
 #include "PdfReadBack.h"
 #include "SheetLayout.h"
 
@@ -14,19 +15,6 @@ namespace
 
 using kareport::PrintInfo;
 using Shows = kareport::SheetReportView::Shows;
-
-/// A part of the upper left of a sheet, at printer dots.
-QImage sheetImage(const std::function<void(QPainter &)> &draw)
-{
-    QImage image(3000, 3000, QImage::Format_Grayscale8);
-    image.setDotsPerMeterX(23622);
-    image.setDotsPerMeterY(23622);
-    image.fill(Qt::white);
-    QPainter painter(&image);
-    draw(painter);
-    painter.end();
-    return image;
-}
 
 struct Page
 {
@@ -83,11 +71,12 @@ TEST(SheetsPrinted, ASheetIsDrawnAsItIsPrinted)
             shown.view().OnEndPrinting(painter, info);
         };
         for (int number = 1; number <= layout->count(); ++number) {
-            const QImage onPaper = sheetImage([&](QPainter &painter) { drawPage(painter, number); });
-            const QImage onScreen = sheetImage([&](QPainter &painter) { layout->draw(painter, number - 1); });
+            const QImage onPaper = sheetImage(QSize(3000, 3000), [&](QPainter &painter) { drawPage(painter, number); });
+            const QImage onScreen =
+                sheetImage(QSize(3000, 3000), [&](QPainter &painter) { layout->draw(painter, number - 1); });
             ASSERT_EQ(onScreen, onPaper) << "sheet " << number;
         }
-        sheetImage([&](QPainter &painter) { drawPage(painter, layout->count() + 1); });
+        sheetImage(QSize(3000, 3000), [&](QPainter &painter) { drawPage(painter, layout->count() + 1); });
         EXPECT_EQ(printed, layout->count()) << "there is no sheet more on paper";
         EXPECT_GT(printed, 2);
     }

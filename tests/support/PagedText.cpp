@@ -38,3 +38,16 @@ QString shortLines(int count)
 {
     return QStringLiteral("line\n").repeated(count);
 }
+
+QImage sheetImage(const QSize &size, const std::function<void(QPainter &)> &draw)
+{
+    constexpr int dotsPerMetre = 23622;
+    QImage image(size, QImage::Format_Grayscale8);
+    image.setDotsPerMeterX(dotsPerMetre);
+    image.setDotsPerMeterY(dotsPerMetre);
+    image.fill(Qt::white);
+    QPainter painter(&image);
+    draw(painter);
+    painter.end();
+    return image;
+}

@@ -2,6 +2,7 @@
 
 #include "LinePager.h"
 
+#include <QImage>
 #include <QPainter>
 #include <QPlainTextDocumentLayout>
 #include <QPrinter>
@@ -10,6 +11,7 @@
 
 #include <gtest/gtest.h>
 
+#include <functional>
 #include <memory>
 #include <vector>
 
@@ -38,3 +40,6 @@ private:
 
 /// Lines of four characters and their end.
 QString shortLines(int count);
+
+/// The dots of the upper left of a sheet on a printer of 600 dots per inch, with what a painter draws on it.
+QImage sheetImage(const QSize &size, const std::function<void(QPainter &)> &draw);

@@ -2,17 +2,13 @@
 
 #include "JobSettings.h"
 #include "OrientationOrder.h"
+#include "ValueBoxes.h"
 #include "Xlate.h"
 
 #include <QApplication>
-#include <QComboBox>
 #include <QKeyEvent>
-#include <QSignalBlocker>
-#include <QSpinBox>
 
 #include <algorithm>
-#include <initializer_list>
-#include <utility>
 
 namespace kareport
 {
@@ -20,42 +16,9 @@ namespace kareport
 namespace
 {
 
-constexpr int mostDecimals = 15;
-
-/// A list of choices, each with the value that it means.
-template <typename Value>
-QComboBox *choice(std::initializer_list<std::pair<Value, QString>> items)
+QSpinBox *wholeDecimals()
 {
-    auto *box = new QComboBox;
-    for (const auto &[value, text] : items) {
-        box->addItem(text, static_cast<int>(value));
-    }
-    return box;
-}
-
-template <typename Value>
-Value chosenIn(const QComboBox &box)
-{
-    return static_cast<Value>(box.currentData().toInt());
-}
-
-template <typename Value>
-void display(QComboBox &box, Value value)
-{
-    const QSignalBlocker blocker(box);
-    box.setCurrentIndex(box.findData(static_cast<int>(value)));
-}
-
-void display(QSpinBox &box, int value)
-{
-    const QSignalBlocker blocker(box);
-    box.setValue(value);
-}
-
-QSpinBox *decimals()
-{
-    auto *box = new QSpinBox;
-    box->setRange(0, mostDecimals);
+    QSpinBox *box = decimals(mostDecimals);
     box->setKeyboardTracking(false); // a number of two digits is chosen when both are there
     return box;
 }
@@ -72,7 +35,7 @@ UnitsBar::UnitsBar(QWidget *parent) : QToolBar(Xlate("Units"), parent)
                                           {LengthUnit::InternationalFoot, QStringLiteral("ft")},
                                           {LengthUnit::UsSurveyFoot, QStringLiteral("US ft")}}),
                       Xlate("Unit of lengths"));
-    lengthDecimals_ = add(decimals(), Xlate("Decimals of lengths"));
+    lengthDecimals_ = add(wholeDecimals(), Xlate("Decimals of lengths"));
     addSeparator();
     areaUnit_ = add(choice<AreaUnit>({{AreaUnit::SquareMetre, QStringLiteral("m²")},
                                       {AreaUnit::Hectare, QStringLiteral("ha")},
@@ -84,13 +47,13 @@ UnitsBar::UnitsBar(QWidget *parent) : QToolBar(Xlate("Units"), parent)
                                         {AngleUnit::Gon, QStringLiteral("gon")},
                                         {AngleUnit::Radian, QStringLiteral("rad")}}),
                      Xlate("Unit of angles"));
-    numberDecimals_ = add(decimals(), Xlate("Decimals of numbers and areas"));
+    numberDecimals_ = add(wholeDecimals(), Xlate("Decimals of numbers and areas"));
     addSeparator();
     stationFormat_ = add(choice<Station>({{Station::Plain, QStringLiteral("12345.678")},
                                           {Station::HundredsPlus, QStringLiteral("123+45.678")},
                                           {Station::ThousandsPlus, QStringLiteral("12+345.678")}}),
                          Xlate("Form of stations"));
-    stationDecimals_ = add(decimals(), Xlate("Decimals of stations"));
+    stationDecimals_ = add(wholeDecimals(), Xlate("Decimals of stations"));
     addSeparator();
     northEastOrder_ =
         add(choice<int>({{ORDER_NORTHING_EASTING, Xlate("N, E")}, {ORDER_EASTING_NORTHING, Xlate("E, N")}}),
