@@ -38,14 +38,14 @@ constexpr double sampleAngle = (7 + 5 / 60.0) * std::numbers::pi / 180;         
 constexpr double sampleBearing = (135 + 4 / 60.0 + 9.25 / 3600.0) * std::numbers::pi / 180; // 135°04'09.25"
 
 template <typename Value>
-QComboBox *choice(Value current, std::initializer_list<std::pair<std::type_identity_t<Value>, QString>> items)
+QComboBox *choiceOf(Value current, std::initializer_list<std::pair<std::type_identity_t<Value>, QString>> items)
 {
     QComboBox *box = choice<Value>(items);
     display(*box, current);
     return box;
 }
 
-QSpinBox *decimals(int value, int most)
+QSpinBox *decimalsOf(int value, int most)
 {
     QSpinBox *box = decimals(most);
     box->setValue(value);
@@ -70,35 +70,35 @@ void addPair(QFormLayout &form, const QString &label, QWidget *first, const QStr
 
 UnitsPage::UnitsPage(const UJobSettings &settings, QWidget *parent)
     : QWidget(parent),
-      lengthUnit_(choice(settings.lengthUnit, {{LengthUnit::Metre, Xlate("Metre")},
-                                               {LengthUnit::Millimetre, Xlate("Millimetre")},
-                                               {LengthUnit::Kilometre, Xlate("Kilometre")},
-                                               {LengthUnit::InternationalFoot, Xlate("International foot")},
-                                               {LengthUnit::UsSurveyFoot, Xlate("US survey foot")}})),
-      lengthDecimals_(decimals(settings.lengthDecimals, mostDecimals)),
-      areaUnit_(choice(settings.areaUnit, {{AreaUnit::SquareMetre, Xlate("Square metre")},
-                                           {AreaUnit::Hectare, Xlate("Hectare")},
-                                           {AreaUnit::SquareKilometre, Xlate("Square kilometre")},
-                                           {AreaUnit::SquareFoot, Xlate("Square foot")},
-                                           {AreaUnit::Acre, Xlate("Acre")}})),
-      angleUnit_(choice(settings.angleUnit, {{AngleUnit::Degree, Xlate("Degree")},
-                                             {AngleUnit::Gon, Xlate("Gon")},
-                                             {AngleUnit::Radian, Xlate("Radian")}})),
-      numberDecimals_(decimals(settings.numberDecimals, mostDecimals)),
-      stationFormat_(
-          choice(settings.stationFormat, {{UJobSettings::StationFormat::Plain, QStringLiteral("12345.678")},
-                                          {UJobSettings::StationFormat::HundredsPlus, QStringLiteral("123+45.678")},
-                                          {UJobSettings::StationFormat::ThousandsPlus, QStringLiteral("12+345.678")}})),
-      stationDecimals_(decimals(settings.stationDecimals, mostDecimals)),
-      northEastOrder_(choice<int>(settings.northEastOrder, {{ORDER_EASTING_NORTHING, Xlate("Easting, northing")},
-                                                            {ORDER_NORTHING_EASTING, Xlate("Northing, easting")}})),
-      bearingUnit_(choice<unsigned>(
+      lengthUnit_(choiceOf(settings.lengthUnit, {{LengthUnit::Metre, Xlate("Metre")},
+                                                 {LengthUnit::Millimetre, Xlate("Millimetre")},
+                                                 {LengthUnit::Kilometre, Xlate("Kilometre")},
+                                                 {LengthUnit::InternationalFoot, Xlate("International foot")},
+                                                 {LengthUnit::UsSurveyFoot, Xlate("US survey foot")}})),
+      lengthDecimals_(decimalsOf(settings.lengthDecimals, mostDecimals)),
+      areaUnit_(choiceOf(settings.areaUnit, {{AreaUnit::SquareMetre, Xlate("Square metre")},
+                                             {AreaUnit::Hectare, Xlate("Hectare")},
+                                             {AreaUnit::SquareKilometre, Xlate("Square kilometre")},
+                                             {AreaUnit::SquareFoot, Xlate("Square foot")},
+                                             {AreaUnit::Acre, Xlate("Acre")}})),
+      angleUnit_(choiceOf(settings.angleUnit, {{AngleUnit::Degree, Xlate("Degree")},
+                                               {AngleUnit::Gon, Xlate("Gon")},
+                                               {AngleUnit::Radian, Xlate("Radian")}})),
+      numberDecimals_(decimalsOf(settings.numberDecimals, mostDecimals)),
+      stationFormat_(choiceOf(settings.stationFormat,
+                              {{UJobSettings::StationFormat::Plain, QStringLiteral("12345.678")},
+                               {UJobSettings::StationFormat::HundredsPlus, QStringLiteral("123+45.678")},
+                               {UJobSettings::StationFormat::ThousandsPlus, QStringLiteral("12+345.678")}})),
+      stationDecimals_(decimalsOf(settings.stationDecimals, mostDecimals)),
+      northEastOrder_(choiceOf<int>(settings.northEastOrder, {{ORDER_EASTING_NORTHING, Xlate("Easting, northing")},
+                                                              {ORDER_NORTHING_EASTING, Xlate("Northing, easting")}})),
+      bearingUnit_(choiceOf<unsigned>(
           settings.bearingUnit,
           {{0U, Xlate("Degrees, minutes, seconds")}, {1U, Xlate("Decimal degrees")}, {2U, Xlate("Gon")}})),
-      bearingDecimals_(decimals(settings.bearingDecimals, mostBearingDecimals)),
-      bearingStyle_(choice<int>(settings.bearingStyle, {{0, Xlate("Whole circle")}, {1, Xlate("Quadrant")}})),
+      bearingDecimals_(decimalsOf(settings.bearingDecimals, mostBearingDecimals)),
+      bearingStyle_(choiceOf<int>(settings.bearingStyle, {{0, Xlate("Whole circle")}, {1, Xlate("Quadrant")}})),
       bearingReference_(
-          choice<unsigned>(settings.bearingReference, {{0U, Xlate("From north")}, {1U, Xlate("From south")}})),
+          choiceOf<unsigned>(settings.bearingReference, {{0U, Xlate("From north")}, {1U, Xlate("From south")}})),
       bearingPadding_(new QCheckBox(Xlate("Leading &zeros"))),
       samples_(plainLabel())
 {
