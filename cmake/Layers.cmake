@@ -15,6 +15,11 @@ endif()
 if(KAREPORT_WERROR)
     target_compile_options(ka_options INTERFACE -Werror)
 endif()
+# Several sources that are compiled together are one file to the compiler, and only the main one may keep a class to itself.
+# What GCC finds uninitialized in so much inlined code is not; in the release, file by file, it looks.
+if(CMAKE_UNITY_BUILD)
+    target_compile_options(ka_options INTERFACE -Wno-subobject-linkage -Wno-maybe-uninitialized)
+endif()
 if(KAREPORT_SANITIZE)
     target_compile_options(ka_options INTERFACE -fsanitize=${KAREPORT_SANITIZE} -fno-omit-frame-pointer
                                                 -fno-sanitize-recover=all)
@@ -31,6 +36,9 @@ set(KA_CORE_HEADERS
     <QByteArray> <QDir> <QFile> <QFileInfo> <QHash> <QString> <QStringList> <QVariant> <algorithm> <functional> <memory>
     <optional> <string> <utility> <variant> <vector>)
 set(KA_WIDGET_HEADERS ${KA_CORE_HEADERS} <QApplication> <QFont> <QPainter> <QWidget>)
+
+# What compiles them for all others.
+set(KA_PRECOMPILING ka_values_objects ka_frame_objects)
 
 # ka_precompile(<target> <whether it sees Qt's windows>)
 function(ka_precompile target widgets)
@@ -65,8 +73,6 @@ endfunction()
 function(ka_layer target)
     cmake_parse_arguments(arg "WIDGETS" "" "LINKS;USES;HEADERS;PRIVATE_HEADERS;SOURCES;COMMON_SOURCES" ${ARGN})
     ka_api(${target} ${arg_LINKS})
-    # Not of the target: the compiled headers serve what is outside the libraries as well.
-    set_source_files_properties(${arg_SOURCES} ${arg_COMMON_SOURCES} PROPERTIES COMPILE_DEFINITIONS KAREPORT_BUILDING)
     set(objects ${target}_objects)
     add_library(${target}_objects OBJECT ${arg_SOURCES})
     if(arg_COMMON_SOURCES)
@@ -76,7 +82,14 @@ function(ka_layer target)
     foreach(library IN LISTS objects)
         target_link_libraries(${library} PUBLIC ${target}_api ${arg_USES} PRIVATE ka_options ka_hardening)
         ka_precompile(${library} "${arg_WIDGETS}")
+        if(NOT library IN_LIST KA_PRECOMPILING)
+            target_compile_definitions(${library} PRIVATE KAREPORT_BUILDING)
+        endif()
     endforeach()
+    if(${target}_objects IN_LIST KA_PRECOMPILING)
+        # Not of the target: its compiled headers serve what is outside the libraries as well.
+        set_source_files_properties(${arg_SOURCES} ${arg_COMMON_SOURCES} PROPERTIES COMPILE_DEFINITIONS KAREPORT_BUILDING)
+    endif()
 
     add_library(${target} STATIC)
     target_link_libraries(${target} PUBLIC ${objects} ${target}_api ${arg_LINKS} ${arg_USES})

@@ -1,5 +1,7 @@
 #include "Alignment.h"
 
+#include "Stationing.h"
+
 #include <algorithm>
 
 namespace kareport
@@ -20,22 +22,21 @@ std::size_t Alignment::elementAt(double distance) const
 
 std::optional<CurvePlace> Alignment::at(double distance, bool before) const
 {
-    constexpr double rounding = 1e-7;
-    if (elements_.empty() || !(distance >= -rounding && distance <= length_ + rounding)) {
+    if (elements_.empty() || !(distance >= -stationTolerance && distance <= length_ + stationTolerance)) {
         return std::nullopt;
     }
     std::size_t index = elementAt(distance);
     // A distance that misses a border by its last digits is on it.
-    if (before && index > 0 && distance <= elements_[index].start + rounding) {
+    if (before && index > 0 && distance <= elements_[index].start + stationTolerance) {
         --index;
-    } else if (!before && index + 1 < elements_.size() && distance >= elements_[index + 1].start - rounding) {
+    } else if (!before && index + 1 < elements_.size() && distance >= elements_[index + 1].start - stationTolerance) {
         ++index;
     }
     const Element &element = elements_[index];
     double along = distance - element.start;
-    if (along < rounding) {
+    if (along < stationTolerance) {
         along = 0;
-    } else if (along > element.length - rounding) {
+    } else if (along > element.length - stationTolerance) {
         along = element.length;
     }
     return element.curve.at(along * (element.curve.length() / element.length));

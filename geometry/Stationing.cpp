@@ -7,17 +7,10 @@
 namespace kareport
 {
 
-namespace
-{
-
-constexpr double rounding = 1e-7;
-
-} // namespace
-
 bool Stationing::add(const StationEquation &equation)
 {
-    const bool isAhead = equations_.empty() ? equation.internal >= start_ - rounding
-                                            : equation.internal > equations_.back().internal + rounding;
+    const bool isAhead = equations_.empty() ? equation.internal >= start_ - stationTolerance
+                                            : equation.internal > equations_.back().internal + stationTolerance;
     if (!std::isfinite(equation.internal) || !std::isfinite(equation.ahead) || !isAhead) {
         return false;
     }
@@ -29,7 +22,7 @@ Stationing::Name Stationing::nameOf(double internal, bool back) const
 {
     // What misses an equation by its last digits is on it.
     const auto next =
-        std::upper_bound(equations_.begin(), equations_.end(), internal + (back ? -rounding : rounding),
+        std::upper_bound(equations_.begin(), equations_.end(), internal + (back ? -stationTolerance : stationTolerance),
                          [](double at, const StationEquation &equation) { return at < equation.internal; });
     const auto region = static_cast<std::size_t>(next - equations_.begin());
     if (region == 0) {
@@ -57,8 +50,8 @@ std::vector<double> Stationing::placesOf(double station, double endInternal) con
         const double from = region == 0 ? start_ : equations_[region - 1].internal;
         const double to = region == equations_.size() ? endInternal : equations_[region].internal;
         const double place = internalIn(region, station);
-        const bool isThere = place >= from - rounding && place <= std::min(to, endInternal) + rounding;
-        if (isThere && (places.empty() || place > places.back() + rounding)) {
+        const bool isThere = place >= from - stationTolerance && place <= std::min(to, endInternal) + stationTolerance;
+        if (isThere && (places.empty() || place > places.back() + stationTolerance)) {
             places.push_back(place);
         }
     }
@@ -68,9 +61,9 @@ std::vector<double> Stationing::placesOf(double station, double endInternal) con
 const StationEquation *Stationing::equationAt(double internal) const
 {
     const auto next =
-        std::lower_bound(equations_.begin(), equations_.end(), internal - rounding,
+        std::lower_bound(equations_.begin(), equations_.end(), internal - stationTolerance,
                          [](const StationEquation &equation, double at) { return equation.internal < at; });
-    return next != equations_.end() && next->internal <= internal + rounding ? &*next : nullptr;
+    return next != equations_.end() && next->internal <= internal + stationTolerance ? &*next : nullptr;
 }
 
 } // namespace kareport

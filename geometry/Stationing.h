@@ -6,6 +6,9 @@
 namespace kareport
 {
 
+/// In metres: two stations that differ by no more than what rounding leaves are the same.
+inline constexpr double stationTolerance = 1e-7;
+
 /// A place where the count of stations breaks off and continues with another number.
 struct StationEquation
 {

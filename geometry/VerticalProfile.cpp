@@ -1,5 +1,7 @@
 #include "VerticalProfile.h"
 
+#include "Stationing.h"
+
 #include <algorithm>
 #include <cmath>
 #include <limits>
@@ -10,7 +12,6 @@ namespace kareport
 namespace
 {
 
-constexpr double rounding = 1e-7;
 // Curves that follow each other without a grade between them overlap by what a file's digits leave out.
 constexpr double allowedOverlap = 0.002;
 
@@ -152,12 +153,13 @@ std::optional<ProfileFault::Kind> VerticalProfile::addCurve(const Vertex &vertex
 
 const VerticalProfile::Piece *VerticalProfile::pieceAt(double station, bool before) const
 {
-    if (!(station >= start() - rounding && station <= end() + rounding)) {
+    if (!(station >= start() - stationTolerance && station <= end() + stationTolerance)) {
         return nullptr;
     }
     // What misses a border by its last digits is on it.
-    const auto next = std::upper_bound(pieces_.begin(), pieces_.end(), station + (before ? -rounding : rounding),
-                                       [](double at, const Piece &piece) { return at < piece.start; });
+    const auto next =
+        std::upper_bound(pieces_.begin(), pieces_.end(), station + (before ? -stationTolerance : stationTolerance),
+                         [](double at, const Piece &piece) { return at < piece.start; });
     return next == pieces_.begin() ? &pieces_.front() : &*(next - 1);
 }
 

@@ -14,7 +14,7 @@ namespace kareport
 namespace
 {
 
-constexpr std::array<double, 23> powersOfTen = {1e0,  1e1,  1e2,  1e3,  1e4,  1e5,  1e6,  1e7,  1e8,  1e9,  1e10, 1e11,
+constexpr std::array<double, 23> exactPowers = {1e0,  1e1,  1e2,  1e3,  1e4,  1e5,  1e6,  1e7,  1e8,  1e9,  1e10, 1e11,
                                                 1e12, 1e13, 1e14, 1e15, 1e16, 1e17, 1e18, 1e19, 1e20, 1e21, 1e22};
 constexpr int digitsOfDouble = 15;                ///< a decimal of so many comes back from a double
 constexpr qint64 digitsOfParts = 100'000'000'000; ///< degrees of fewer digits were written as such
@@ -89,9 +89,9 @@ double CellDecimal::toDouble() const
 {
     constexpr qint64 mostExact = qint64(1) << 53;
     if (digits >= -mostExact && digits <= mostExact && exponent <= 0 &&
-        static_cast<std::size_t>(-exponent) < powersOfTen.size())
+        static_cast<std::size_t>(-exponent) < exactPowers.size())
     {
-        return static_cast<double>(digits) / powersOfTen[static_cast<std::size_t>(-exponent)];
+        return static_cast<double>(digits) / exactPowers[static_cast<std::size_t>(-exponent)];
     }
     constexpr std::size_t mostDigits = 24;
     std::array<char, 2 * mostDigits> text;
@@ -165,7 +165,7 @@ CellDecimal CellReader::readNumber(double value, double quotient)
         const bool isSafe = static_cast<double>(std::llabs(number.digits)) < mostQuick;
         if (isSafe && decimals > decimals_ && decimals <= mostDecimals()) {
             decimals_ = decimals;
-            power_ = powersOfTen[static_cast<std::size_t>(decimals)];
+            power_ = exactPowers[static_cast<std::size_t>(decimals)];
         }
         return number;
     }

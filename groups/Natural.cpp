@@ -11,12 +11,12 @@ namespace kareport
 namespace
 {
 
-constexpr std::array<quint32, 10> powersOfTen = {1,       10,        100,        1'000,       10'000,
-                                                 100'000, 1'000'000, 10'000'000, 100'000'000, 1'000'000'000};
+constexpr std::array<quint32, 10> limbPowers = {1,       10,        100,        1'000,       10'000,
+                                                100'000, 1'000'000, 10'000'000, 100'000'000, 1'000'000'000};
 
 quint32 powerOfTen(int power)
 {
-    return powersOfTen[static_cast<std::size_t>(power)];
+    return limbPowers[static_cast<std::size_t>(power)];
 }
 
 } // namespace

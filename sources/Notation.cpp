@@ -15,11 +15,6 @@ namespace
 
 constexpr std::string_view digitsAndPoint = "0123456789.";
 
-bool isDigit(char character)
-{
-    return character >= '0' && character <= '9';
-}
-
 /// How many digits there are from a position on.
 std::size_t digitsAt(std::string_view text, std::size_t at)
 {

@@ -16,11 +16,6 @@ bool isBlank(char character)
     return character == ' ' || character == '\t';
 }
 
-bool isDigit(char character)
-{
-    return character >= '0' && character <= '9';
-}
-
 /// The power of ten of a number's first digit that is not 0. @param text  digits, perhaps a sign, a point and an exponent
 qint64 powerOfTen(std::string_view text)
 {

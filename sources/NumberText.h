@@ -10,6 +10,12 @@
 namespace kareport
 {
 
+/// Whether a byte is a digit from 0 to 9, whatever the language of the system.
+inline bool isDigit(char byte)
+{
+    return byte >= '0' && byte <= '9';
+}
+
 /// A number as data files write it, INF and NAN among them; blanks around it and one sign are allowed.
 bool parseNumber(std::string_view text, double &number);
 /// A whole number of 32 bits; blanks around it and one sign are allowed.

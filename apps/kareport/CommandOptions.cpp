@@ -9,18 +9,18 @@ namespace kareport
 namespace
 {
 
-CLI::App *addConvert(CLI::App &program, ConvertWords &words, ValueKinds &kinds)
+CLI::App *addConvert(CLI::App &program, ConvertWords &words, ArgumentKinds &kinds)
 {
     CLI::App *convert =
         program.add_subcommand("convert", "Convert a saved report to another kind, by the endings of the names");
     kinds
-        .note(ValueKind::SavedReport,
+        .note(ArgumentKind::SavedReport,
               convert->add_option("IN", words.input, "Saved report: a report file, rich text, or plain text in UTF-8"))
         ->required();
-    kinds.note(ValueKind::File, convert->add_option("OUT", words.output, "Output file; - for standard output"))
+    kinds.note(ArgumentKind::File, convert->add_option("OUT", words.output, "Output file; - for standard output"))
         ->required();
     addAs(*convert, words.as, "Kind of the output if its name does not show it", kinds);
-    addSets(*convert, words.sets, ValueKind::PageKey,
+    addSets(*convert, words.sets, ArgumentKind::PageKey,
             "Set a key of the page, such as page.linesPerPage=60. Can be given several times", kinds);
     addParents(*convert, words.parents);
     convert->add_flag("--progress", words.progress, "Show the progress of the work");
@@ -34,12 +34,12 @@ CLI::App *addConvert(CLI::App &program, ConvertWords &words, ValueKinds &kinds)
     return convert;
 }
 
-CLI::App *addTemplates(CLI::App &program, TemplatesWords &words, ValueKinds &kinds)
+CLI::App *addTemplates(CLI::App &program, TemplatesWords &words, ArgumentKinds &kinds)
 {
     CLI::App *templates = program.add_subcommand("templates", "List the templates of a template file");
-    kinds.note(ValueKind::TemplateFile, templates->add_option("FILE", words.file, "Template file"))->required();
+    kinds.note(ArgumentKind::TemplateFile, templates->add_option("FILE", words.file, "Template file"))->required();
     kinds
-        .note(ValueKind::TemplateName,
+        .note(ArgumentKind::TemplateName,
               templates->add_option("-n,--name", words.name,
                                     "Show this template's tables, blocks, dictionaries and options"))
         ->type_name("NAME");
@@ -47,20 +47,20 @@ CLI::App *addTemplates(CLI::App &program, TemplatesWords &words, ValueKinds &kin
     return templates;
 }
 
-CLI::App *addCheck(CLI::App &program, CheckWords &words, ValueKinds &kinds)
+CLI::App *addCheck(CLI::App &program, CheckWords &words, ArgumentKinds &kinds)
 {
     CLI::App *check = program.add_subcommand(
         "check", "Report what in template files is not read as it looks, and how the data of jobs fits its template");
     kinds
-        .note(ValueKind::CheckedFile,
+        .note(ArgumentKind::CheckedFile,
               check->add_option("FILE", words.files,
                                 "Template file (XML) or job file (JSON), - for a job on standard input"))
         ->required();
-    addSets(*check, words.sets, ValueKind::SetKey,
+    addSets(*check, words.sets, ArgumentKind::SetKey,
             "Set a key of the jobs, such as settings.lengthUnit=ft. Can be given several times", kinds);
     check->add_flag("--strict", words.strict, "Treat it as an error when data and template do not match");
     kinds
-        .note(ValueKind::File,
+        .note(ArgumentKind::File,
               check->add_option("--notes", words.notes, "Write the notes on the data of a job to a file, as JSON"))
         ->type_name("FILE");
     addParents(*check, words.parents);
@@ -78,11 +78,11 @@ CLI::App *addCheck(CLI::App &program, CheckWords &words, ValueKinds &kinds)
     return check;
 }
 
-CLI::App *addNew(CLI::App &program, NewWords &words, ValueKinds &kinds)
+CLI::App *addNew(CLI::App &program, NewWords &words, ArgumentKinds &kinds)
 {
     CLI::App *add = program.add_subcommand("new", "Write a template, data and a job to start with");
     kinds.note(
-        ValueKind::Folder,
+        ArgumentKind::Folder,
         add->add_option("DIR", words.folder,
                         "Folder that they are written into and named after, made if it is not there; the current "
                         "folder otherwise"));
@@ -95,7 +95,7 @@ CLI::App *addNew(CLI::App &program, NewWords &words, ValueKinds &kinds)
     return add;
 }
 
-CommandWords wordsOf(const CLI::App &command, const ValueKinds &kinds)
+CommandWords wordsOf(const CLI::App &command, const ArgumentKinds &kinds)
 {
     CommandWords words{textOf(command.get_name()), textOf(command.get_description()), {}, {}};
     for (const CLI::Option *option : command.get_options()) {
@@ -110,7 +110,7 @@ CommandWords wordsOf(const CLI::App &command, const ValueKinds &kinds)
         }
         one.longName = QStringLiteral("--") + textOf(option->get_lnames().front());
         one.shortName = option->get_snames().empty() ? QString() : u'-' + textOf(option->get_snames().front());
-        one.valueName = one.kind == ValueKind::Flag ? QString() : textOf(option->get_type_name());
+        one.valueName = one.kind == ArgumentKind::Flag ? QString() : textOf(option->get_type_name());
         words.options.push_back(one);
     }
     return words;
@@ -132,25 +132,26 @@ QStringList textsOf(const std::vector<std::string> &words)
     return list;
 }
 
-CLI::Option *ValueKinds::note(ValueKind kind, CLI::Option *option)
+CLI::Option *ArgumentKinds::note(ArgumentKind kind, CLI::Option *option)
 {
     kinds_.insert_or_assign(option, kind);
     return option;
 }
 
-ValueKind ValueKinds::of(const CLI::Option *option) const
+ArgumentKind ArgumentKinds::of(const CLI::Option *option) const
 {
     const auto found = kinds_.find(option);
-    return found != kinds_.end() ? found->second : ValueKind::Flag;
+    return found != kinds_.end() ? found->second : ArgumentKind::Flag;
 }
 
-void addAs(CLI::App &command, std::string &as, const char *text, ValueKinds &kinds)
+void addAs(CLI::App &command, std::string &as, const char *text, ArgumentKinds &kinds)
 {
     const std::string sentence = std::string(text) + ": " + outputKindNames().toStdString();
-    kinds.note(ValueKind::OutputKind, command.add_option("--as", as, sentence))->type_name("KIND");
+    kinds.note(ArgumentKind::OutputKind, command.add_option("--as", as, sentence))->type_name("KIND");
 }
 
-void addSets(CLI::App &command, std::vector<std::string> &sets, ValueKind kind, const char *text, ValueKinds &kinds)
+void addSets(CLI::App &command, std::vector<std::string> &sets, ArgumentKind kind, const char *text,
+             ArgumentKinds &kinds)
 {
     kinds.note(kind, command.add_option("--set", sets, text))->type_name("KEY=VALUE")->allow_extra_args(false);
 }
@@ -198,13 +199,13 @@ CommandLine::CommandLine()
     newCommand = addNew(program, newJob, kinds);
     viewCommand = program.add_subcommand("view", "Open a report, a job or a template in a window");
     kinds
-        .note(ValueKind::ViewedFile,
+        .note(ArgumentKind::ViewedFile,
               viewCommand->add_option("FILE", viewFile, "Report (.rep, .rtf), job (.json) or template (.xml)"))
         ->required();
     helpCommand = program.add_subcommand("help", "Show the help of a command");
-    kinds.note(ValueKind::Command, helpCommand->add_option("COMMAND", helpFor, "Command; all of them otherwise"));
+    kinds.note(ArgumentKind::Command, helpCommand->add_option("COMMAND", helpFor, "Command; all of them otherwise"));
     completionCommand = program.add_subcommand("completion", "Print what completes the command line in a shell");
-    kinds.note(ValueKind::Shell, completionCommand->add_option("SHELL", shell, "bash, zsh or fish"))->required();
+    kinds.note(ArgumentKind::Shell, completionCommand->add_option("SHELL", shell, "bash, zsh or fish"))->required();
     completionCommand->footer("The package has installed it already.\n"
                               "Example:\n"
                               "  source <(kareport completion bash)");

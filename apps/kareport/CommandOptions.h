@@ -18,16 +18,16 @@ QString textOf(const std::string &word);
 QStringList textsOf(const std::vector<std::string> &words);
 
 /// What the options take that were added to a command line, beside what its parser knows of them.
-class ValueKinds
+class ArgumentKinds
 {
 public:
     /// Notes what an option takes. @return the option
-    CLI::Option *note(ValueKind kind, CLI::Option *option);
-    /// `ValueKind::Flag` for an option that was not noted.
-    ValueKind of(const CLI::Option *option) const;
+    CLI::Option *note(ArgumentKind kind, CLI::Option *option);
+    /// `ArgumentKind::Flag` for an option that was not noted.
+    ArgumentKind of(const CLI::Option *option) const;
 
 private:
-    std::map<const CLI::Option *, ValueKind> kinds_;
+    std::map<const CLI::Option *, ArgumentKind> kinds_;
 };
 
 /// What the options about the data of the short form are read into.
@@ -129,7 +129,7 @@ struct CommandLine
     CommandLine();
 
     CLI::App program{"Fixed-pitch reports for civil engineering and surveying"};
-    ValueKinds kinds;
+    ArgumentKinds kinds;
     RenderWords render;
     RenderWords watch;
     ConvertWords convert;
@@ -153,13 +153,14 @@ struct CommandLine
     std::vector<CommandWords> words() const;
 };
 
-CLI::App *addRender(CLI::App &program, RenderWords &words, ValueKinds &kinds);
-CLI::App *addWatch(CLI::App &program, RenderWords &words, ValueKinds &kinds);
+CLI::App *addRender(CLI::App &program, RenderWords &words, ArgumentKinds &kinds);
+CLI::App *addWatch(CLI::App &program, RenderWords &words, ArgumentKinds &kinds);
 
 /// Adds an option that gives the kinds of outputs; one that sets keys of a job, or with `PageKey` of its page; one that makes
 /// missing folders.
-void addAs(CLI::App &command, std::string &as, const char *text, ValueKinds &kinds);
-void addSets(CLI::App &command, std::vector<std::string> &sets, ValueKind kind, const char *text, ValueKinds &kinds);
+void addAs(CLI::App &command, std::string &as, const char *text, ArgumentKinds &kinds);
+void addSets(CLI::App &command, std::vector<std::string> &sets, ArgumentKind kind, const char *text,
+             ArgumentKinds &kinds);
 void addParents(CLI::App &command, bool &parents);
 
 } // namespace kareport

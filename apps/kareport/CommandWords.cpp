@@ -18,28 +18,28 @@ QStringList listOf(const char *words)
 
 } // namespace
 
-QStringList endingsOf(ValueKind kind)
+QStringList endingsOf(ArgumentKind kind)
 {
     switch (kind) {
-    case ValueKind::TemplateFile: return listOf("xml");
-    case ValueKind::JobFile: return listOf("json");
-    case ValueKind::CheckedFile: return listOf("xml json");
-    case ValueKind::SavedReport: return listOf("rep rtf txt");
-    case ValueKind::ViewedFile: return listOf("rep rtf json xml");
+    case ArgumentKind::TemplateFile: return listOf("xml");
+    case ArgumentKind::JobFile: return listOf("json");
+    case ArgumentKind::CheckedFile: return listOf("xml json");
+    case ArgumentKind::SavedReport: return listOf("rep rtf txt");
+    case ArgumentKind::ViewedFile: return listOf("rep rtf json xml");
     default: return {};
     }
 }
 
-QStringList fixedValuesOf(ValueKind kind)
+QStringList fixedValuesOf(ArgumentKind kind)
 {
     switch (kind) {
-    case ValueKind::OutputKind: return outputKindNames().split(QStringLiteral(", "));
-    case ValueKind::SetKey: return setKeys(QString());
-    case ValueKind::PageKey: return setKeys(QStringLiteral("page."));
-    case ValueKind::Delimiter: return listOf("auto tab whitespace");
-    case ValueKind::Decimal: return listOf(". ,");
-    case ValueKind::Encoding: return listOf("utf-8 latin-1 windows-1252 utf-16");
-    case ValueKind::Shell: return listOf("bash zsh fish");
+    case ArgumentKind::OutputKind: return outputKindNames().split(QStringLiteral(", "));
+    case ArgumentKind::SetKey: return setKeys(QString());
+    case ArgumentKind::PageKey: return setKeys(QStringLiteral("page."));
+    case ArgumentKind::Delimiter: return listOf("auto tab whitespace");
+    case ArgumentKind::Decimal: return listOf(". ,");
+    case ArgumentKind::Encoding: return listOf("utf-8 latin-1 windows-1252 utf-16");
+    case ArgumentKind::Shell: return listOf("bash zsh fish");
     default: return {};
     }
 }

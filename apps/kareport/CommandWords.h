@@ -9,7 +9,7 @@ namespace kareport
 {
 
 /// What an option or an argument takes, for completion.
-enum class ValueKind
+enum class ArgumentKind
 {
     Flag, ///< an option that takes nothing
     Text, ///< what only the user knows
@@ -40,7 +40,7 @@ struct OptionWords
     QString shortName = {}; ///< "-o"; empty for none
     QString valueName = {}; ///< as the help shows it; empty for a flag
     QString description = {};
-    ValueKind kind = ValueKind::Flag;
+    ArgumentKind kind = ArgumentKind::Flag;
     bool isRepeated = false; ///< can be given several times
 };
 
@@ -54,11 +54,11 @@ struct CommandWords
 };
 
 /// The endings of the files of a kind, without their dots; empty for any file, and for what is no file.
-QStringList endingsOf(ValueKind kind);
+QStringList endingsOf(ArgumentKind kind);
 
 /// The values of a kind that are always the same; empty where they depend on something else. Of KEY=VALUE, a key whose values are
 /// not known ends with "=".
-QStringList fixedValuesOf(ValueKind kind);
+QStringList fixedValuesOf(ArgumentKind kind);
 
 /// The names of the commands, or of all options of a command, short ones included.
 QStringList commandNames(const std::vector<CommandWords> &commands);

@@ -7,7 +7,7 @@ namespace
 {
 
 // It needs nothing but bash: the package bash-completion loads it by its name, but it can be sourced without that as well.
-constexpr const char *functions = R"sh(# Completion of kareport for bash. Made by "kareport completion bash".
+constexpr const char *bashFunctions = R"sh(# Completion of kareport for bash. Made by "kareport completion bash".
 
 # Prints a word of the command line without its quotes.
 _kareport_plain()
@@ -143,19 +143,19 @@ _kareport()
 )sh";
 
 /// The call that completes a value of a kind.
-QString completing(ValueKind kind)
+QString completingInBash(ArgumentKind kind)
 {
     const QStringList values = fixedValuesOf(kind);
     switch (kind) {
-    case ValueKind::Flag:
-    case ValueKind::Text: return QStringLiteral("return");
-    case ValueKind::Folder: return QStringLiteral("_kareport_folders");
-    case ValueKind::TemplateName: return QStringLiteral("_kareport_names template");
-    case ValueKind::TableName: return QStringLiteral("_kareport_names table");
-    case ValueKind::BlockName: return QStringLiteral("_kareport_names block");
-    case ValueKind::SetKey:
-    case ValueKind::PageKey: return QStringLiteral("_kareport_keys '%1'").arg(values.join(u' '));
-    case ValueKind::Command: return QStringLiteral("_kareport_words \"$commands\"");
+    case ArgumentKind::Flag:
+    case ArgumentKind::Text: return QStringLiteral("return");
+    case ArgumentKind::Folder: return QStringLiteral("_kareport_folders");
+    case ArgumentKind::TemplateName: return QStringLiteral("_kareport_names template");
+    case ArgumentKind::TableName: return QStringLiteral("_kareport_names table");
+    case ArgumentKind::BlockName: return QStringLiteral("_kareport_names block");
+    case ArgumentKind::SetKey:
+    case ArgumentKind::PageKey: return QStringLiteral("_kareport_keys '%1'").arg(values.join(u' '));
+    case ArgumentKind::Command: return QStringLiteral("_kareport_words \"$commands\"");
     default: break;
     }
     if (!values.isEmpty()) {
@@ -170,20 +170,20 @@ QString completingArgument(const CommandWords &command)
     if (command.arguments.empty()) {
         return QStringLiteral("return");
     }
-    return completing(command.arguments.size() == 1 ? command.arguments.front().kind : ValueKind::File);
+    return completingInBash(command.arguments.size() == 1 ? command.arguments.front().kind : ArgumentKind::File);
 }
 
 QString casesOfValues(const CommandWords &command)
 {
     QString cases;
     for (const OptionWords &option : command.options) {
-        if (option.kind != ValueKind::Flag) {
+        if (option.kind != ArgumentKind::Flag) {
             QString pattern = command.name + u',' + option.longName;
             if (!option.shortName.isEmpty()) {
                 pattern += QStringLiteral(" | ") + command.name + u',' + option.shortName;
             }
             cases += QStringLiteral("        %1)\n            %2\n            return\n            ;;\n")
-                         .arg(pattern, completing(option.kind));
+                         .arg(pattern, completingInBash(option.kind));
         }
     }
     return cases;
@@ -193,7 +193,7 @@ QString casesOfValues(const CommandWords &command)
 
 QString bashCompletion(const std::vector<CommandWords> &commands)
 {
-    QString script = QString::fromUtf8(functions);
+    QString script = QString::fromUtf8(bashFunctions);
     QString values;
     QString options;
     QString arguments;

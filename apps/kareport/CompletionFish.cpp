@@ -6,7 +6,7 @@ namespace kareport
 namespace
 {
 
-constexpr const char *functions = R"sh(# Completion of kareport for fish. Made by "kareport completion fish".
+constexpr const char *fishFunctions = R"sh(# Completion of kareport for fish. Made by "kareport completion fish".
 
 # Whether the command is one of those given; without any, whether there is none yet.
 function __kareport_command_is
@@ -69,7 +69,7 @@ complete -c kareport -n __kareport_command_is -l help -s h -d 'Print this help m
 complete -c kareport -n __kareport_command_is -l version -d 'Print the version and exit'
 )sh";
 
-QString quoted(const QString &text)
+QString inFishQuotes(const QString &text)
 {
     QString inside = text;
     inside.replace(u'\\', QStringLiteral("\\\\")).replace(u'\'', QStringLiteral("\\'"));
@@ -77,13 +77,13 @@ QString quoted(const QString &text)
 }
 
 /// What completes a value of a kind; empty for any file, and where only the user knows.
-QString completing(ValueKind kind)
+QString completingInFish(ArgumentKind kind)
 {
     switch (kind) {
-    case ValueKind::Folder: return QStringLiteral("(__fish_complete_directories)");
-    case ValueKind::TemplateName: return QStringLiteral("(__kareport_template_names)");
-    case ValueKind::TableName: return QStringLiteral("(__kareport_parts table)");
-    case ValueKind::BlockName: return QStringLiteral("(__kareport_parts block)");
+    case ArgumentKind::Folder: return QStringLiteral("(__fish_complete_directories)");
+    case ArgumentKind::TemplateName: return QStringLiteral("(__kareport_template_names)");
+    case ArgumentKind::TableName: return QStringLiteral("(__kareport_parts table)");
+    case ArgumentKind::BlockName: return QStringLiteral("(__kareport_parts block)");
     default: break;
     }
     QStringList calls;
@@ -94,16 +94,16 @@ QString completing(ValueKind kind)
 }
 
 /// The part of a `complete` command that says what a value is completed with.
-QString valueArguments(ValueKind kind, const QStringList &commands)
+QString valueArguments(ArgumentKind kind, const QStringList &commands)
 {
-    if (kind == ValueKind::Flag) {
+    if (kind == ArgumentKind::Flag) {
         return {};
     }
-    if (kind == ValueKind::File) {
+    if (kind == ArgumentKind::File) {
         return QStringLiteral(" -r -F");
     }
-    const QString words = kind == ValueKind::Command ? commands.join(u' ') : completing(kind);
-    return words.isEmpty() ? QStringLiteral(" -x") : QStringLiteral(" -x -a ") + quoted(words);
+    const QString words = kind == ArgumentKind::Command ? commands.join(u' ') : completingInFish(kind);
+    return words.isEmpty() ? QStringLiteral(" -x") : QStringLiteral(" -x -a ") + inFishQuotes(words);
 }
 
 QString optionLine(const CommandWords &command, const OptionWords &option, const QStringList &commands)
@@ -113,18 +113,18 @@ QString optionLine(const CommandWords &command, const OptionWords &option, const
         line += QStringLiteral(" -s ") + option.shortName.mid(1);
     }
     line += QStringLiteral(" -l ") + option.longName.mid(2) + valueArguments(option.kind, commands);
-    return line + QStringLiteral(" -d ") + quoted(option.description) + u'\n';
+    return line + QStringLiteral(" -d ") + inFishQuotes(option.description) + u'\n';
 }
 
 } // namespace
 
 QString fishCompletion(const std::vector<CommandWords> &commands)
 {
-    QString script = QString::fromUtf8(functions);
+    QString script = QString::fromUtf8(fishFunctions);
     const QStringList names = commandNames(commands);
     for (const CommandWords &command : commands) {
         script += QStringLiteral("complete -c kareport -n __kareport_command_is -a %1 -d %2\n")
-                      .arg(command.name, quoted(command.description));
+                      .arg(command.name, inFishQuotes(command.description));
     }
     for (const CommandWords &command : commands) {
         script += u'\n';

@@ -6,7 +6,7 @@ namespace kareport
 namespace
 {
 
-constexpr const char *functions = R"sh(#compdef kareport
+constexpr const char *zshFunctions = R"sh(#compdef kareport
 # Completion of kareport for zsh. Made by "kareport completion zsh".
 
 # Takes the names of the templates of a file, or with "table" or "block" those of a template's parts.
@@ -34,7 +34,7 @@ _kareport()
 )sh";
 
 /// A text within single quotes.
-QString quoted(QString text)
+QString inZshQuotes(QString text)
 {
     return u'\'' + text.replace(u'\'', QStringLiteral("'\\''")) + u'\'';
 }
@@ -53,17 +53,17 @@ QString escaped(const QString &text)
 }
 
 /// What completes a value of a kind; a blank where only the user knows.
-QString completing(ValueKind kind, const QStringList &commands)
+QString completingInZsh(ArgumentKind kind, const QStringList &commands)
 {
     switch (kind) {
-    case ValueKind::Flag: return {};
-    case ValueKind::Text: return QStringLiteral(" ");
-    case ValueKind::File: return QStringLiteral("_files");
-    case ValueKind::Folder: return QStringLiteral("_files -/");
-    case ValueKind::TemplateName: return QStringLiteral("_kareport_names template");
-    case ValueKind::TableName: return QStringLiteral("_kareport_names table");
-    case ValueKind::BlockName: return QStringLiteral("_kareport_names block");
-    case ValueKind::Command: return QStringLiteral("(%1)").arg(commands.join(u' '));
+    case ArgumentKind::Flag: return {};
+    case ArgumentKind::Text: return QStringLiteral(" ");
+    case ArgumentKind::File: return QStringLiteral("_files");
+    case ArgumentKind::Folder: return QStringLiteral("_files -/");
+    case ArgumentKind::TemplateName: return QStringLiteral("_kareport_names template");
+    case ArgumentKind::TableName: return QStringLiteral("_kareport_names table");
+    case ArgumentKind::BlockName: return QStringLiteral("_kareport_names block");
+    case ArgumentKind::Command: return QStringLiteral("(%1)").arg(commands.join(u' '));
     default: break;
     }
     const QStringList endings = endingsOf(kind);
@@ -71,7 +71,7 @@ QString completing(ValueKind kind, const QStringList &commands)
         return QStringLiteral("_files -g \"*.(#i)(%1)(-.)\"").arg(endings.join(u'|'));
     }
     const QStringList values = fixedValuesOf(kind);
-    if (kind == ValueKind::SetKey || kind == ValueKind::PageKey) {
+    if (kind == ArgumentKind::SetKey || kind == ArgumentKind::PageKey) {
         return QStringLiteral("compadd -S \"\" -- %1").arg(values.join(u' '));
     }
     return QStringLiteral("(%1)").arg(values.join(u' '));
@@ -80,25 +80,25 @@ QString completing(ValueKind kind, const QStringList &commands)
 /// An option for _arguments, with its value after it or after a "=".
 QString optionEntry(const OptionWords &option, const QStringList &commands)
 {
-    const bool takesValue = option.kind != ValueKind::Flag;
+    const bool takesValue = option.kind != ArgumentKind::Flag;
     QString text = u'[' + escaped(option.description) + u']';
     if (takesValue) {
-        text += u':' + escaped(option.valueName) + u':' + completing(option.kind, commands);
+        text += u':' + escaped(option.valueName) + u':' + completingInZsh(option.kind, commands);
     }
     const QString longName = option.longName + (takesValue ? QStringLiteral("=") : QString());
     if (option.shortName.isEmpty()) {
-        return quoted((option.isRepeated ? QStringLiteral("*") : QString()) + longName + text);
+        return inZshQuotes((option.isRepeated ? QStringLiteral("*") : QString()) + longName + text);
     }
     const QString shortName = option.shortName + (takesValue ? QStringLiteral("+") : QString());
     const QString before =
         option.isRepeated ? QStringLiteral("*") : QStringLiteral("(%1 %2)").arg(option.shortName, option.longName);
-    return quoted(before) + u'{' + shortName + u',' + longName + u'}' + quoted(text);
+    return inZshQuotes(before) + u'{' + shortName + u',' + longName + u'}' + inZshQuotes(text);
 }
 
 QString argumentEntry(const OptionWords &argument, std::size_t number, const QStringList &commands)
 {
     const QString place = argument.isRepeated ? QStringLiteral("*") : QString::number(number + 1);
-    return quoted(place + u':' + escaped(argument.valueName) + u':' + completing(argument.kind, commands));
+    return inZshQuotes(place + u':' + escaped(argument.valueName) + u':' + completingInZsh(argument.kind, commands));
 }
 
 QString caseOf(const CommandWords &command, const QStringList &commands)
@@ -118,11 +118,11 @@ QString caseOf(const CommandWords &command, const QStringList &commands)
 
 QString zshCompletion(const std::vector<CommandWords> &commands)
 {
-    QString script = QString::fromUtf8(functions);
+    QString script = QString::fromUtf8(zshFunctions);
     const QStringList names = commandNames(commands);
     script += QStringLiteral("    local -a verbs=(\n");
     for (const CommandWords &command : commands) {
-        script += QStringLiteral("        ") + quoted(command.name + u':' + escaped(command.description)) + u'\n';
+        script += QStringLiteral("        ") + inZshQuotes(command.name + u':' + escaped(command.description)) + u'\n';
     }
     script += QStringLiteral("    )\n"
                              "    _arguments -C '(- : *)'{-h,--help}'[Print this help message and exit]' \\\n"

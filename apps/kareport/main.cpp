@@ -79,7 +79,8 @@ int printCompletion(const CommandLine &line)
 {
     const auto shell = kareport::shellFromName(textOf(line.shell));
     if (!shell) {
-        const QString expected = kareport::oneOfExpected(textOf(line.shell), fixedValuesOf(kareport::ValueKind::Shell));
+        const QString expected =
+            kareport::oneOfExpected(textOf(line.shell), fixedValuesOf(kareport::ArgumentKind::Shell));
         return wrongUsage(QStringLiteral("\"%1\": %2").arg(textOf(line.shell), expected), QStringLiteral("completion"));
     }
     // A script, not a text for a terminal: its characters stay as they are.

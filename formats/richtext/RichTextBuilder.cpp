@@ -8,7 +8,7 @@ namespace kareport
 namespace
 {
 
-constexpr qsizetype pieceSize = qsizetype(64) * 1024;
+constexpr qsizetype longestPending = qsizetype(64) * 1024;
 
 } // namespace
 
@@ -66,7 +66,7 @@ void RichTextBuilder::startBlock(const RichTextParagraph &paragraph, int format)
 
 void RichTextBuilder::insert(QStringView text, int format)
 {
-    if (format != pendingFormat_ || pending_.size() > pieceSize) {
+    if (format != pendingFormat_ || pending_.size() > longestPending) {
         flush();
         pendingFormat_ = format;
     }

@@ -12,12 +12,12 @@ namespace kareport
 namespace
 {
 
-constexpr qsizetype pieceSize = qsizetype(64) * 1024;
+constexpr qsizetype bufferSize = qsizetype(64) * 1024;
 
 bool writeBytes(QIODevice &device, QStringView text, WideCharacters wide)
 {
     QByteArray bytes;
-    bytes.reserve(pieceSize + 16);
+    bytes.reserve(bufferSize + 16);
     for (qsizetype i = 0; i < text.size(); ++i) {
         const char16_t character = text[i].unicode();
         if (character == u'\n') {
@@ -34,7 +34,7 @@ bool writeBytes(QIODevice &device, QStringView text, WideCharacters wide)
                 QChar::isHighSurrogate(character) && i + 1 < text.size() && text[i + 1].isLowSurrogate();
             i += isPair ? 1 : 0;
         }
-        if (bytes.size() >= pieceSize) {
+        if (bytes.size() >= bufferSize) {
             if (device.write(bytes) != bytes.size()) {
                 return false;
             }

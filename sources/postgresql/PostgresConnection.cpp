@@ -12,7 +12,7 @@ namespace kareport
 namespace
 {
 
-constexpr int waitMilliseconds = 50;
+constexpr int pollMilliseconds = 50;
 
 using Options = std::unique_ptr<PQconninfoOption, void (*)(PQconninfoOption *)>;
 
@@ -184,7 +184,7 @@ bool PostgresConnection::isToEnd()
 /// Waits a moment for the server, and takes what it sends. @return false when the connection is lost
 bool PostgresConnection::takeInput(bool forWriting)
 {
-    waitForSocket(pq_.socket(connection_), forWriting, waitMilliseconds);
+    waitForSocket(pq_.socket(connection_), forWriting, pollMilliseconds);
     return pq_.consumeInput(connection_) != 0;
 }
 

@@ -12,8 +12,6 @@ namespace kareport
 namespace
 {
 
-const QString columnsKey = QStringLiteral("columns");
-const QString orderKey = QStringLiteral("order");
 const QString skipped = QStringLiteral("-");
 
 /// Whether a column can be named by its name: no other one has it.

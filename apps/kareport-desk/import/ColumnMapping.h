@@ -11,6 +11,10 @@
 namespace kareport
 {
 
+/// Keys of a job's data that name its columns.
+inline const QString columnsKey = QStringLiteral("columns");
+inline const QString orderKey = QStringLiteral("order");
+
 /// Which variables the user has chosen for columns, in addition to what the names of the columns, or their order, say.
 class ColumnMapping
 {

@@ -35,8 +35,6 @@ constexpr int shownRows = 6;
 
 const QString unitsKey = QStringLiteral("units");
 const QString headerKey = QStringLiteral("header");
-const QString orderKey = QStringLiteral("order");
-const QString columnsKey = QStringLiteral("columns");
 const QString tableKey = QStringLiteral("table");
 
 /// A list of choices with the values of a key; that of the default is empty.
