@@ -6,6 +6,8 @@
 
 #include <QTextDocument>
 
+#include <utility>
+
 namespace kareport
 {
 
@@ -23,14 +25,15 @@ QFont reportFont(const UReportDoc &report)
     return reportFont(report.GetFontName().left(longestFaceName), report.GetFontSize());
 }
 
-QString shownText(const UReportDoc &report)
+std::optional<QString> shownText(const UReportDoc &report)
 {
-    if (!report.GetRTFDataFlag()) {
-        return report.CopyText();
-    }
     QString text;
-    report.GetRTFData(text);
-    return text;
+    if (report.GetRTFDataFlag()) {
+        report.GetRTFData(text);
+    } else {
+        text = report.CopyText();
+    }
+    return text.isNull() ? std::nullopt : std::optional(std::move(text));
 }
 
 QString shownPlainText(const UReportDoc &report)
@@ -53,8 +56,8 @@ std::optional<RichTextError> readShownRichText(const UReportDoc &report, const Q
 
 std::optional<RichTextError> showReportContent(const UReportDoc &report, QTextDocument &document, RichTextNotes *notes)
 {
-    document.setDefaultFont(reportFont(report.GetFontName(), report.GetFontSize()));
-    const QString text = shownText(report);
+    document.setDefaultFont(reportFont(report));
+    const QString text = shownText(report).value_or(QString());
     if (isRichText(text)) {
         return readShownRichText(report, text, document, notes);
     }

@@ -17,10 +17,12 @@ QFont reportFont(const QString &name, unsigned points);
 /// The font of a report's view: its face by the 31 characters that the name of a face has at most.
 QFont reportFont(const UReportDoc &report);
 
-/// The text that a view shows of a report: its rich text in rich-text mode, else its own.
-QString shownText(const UReportDoc &report);
+/// The text that a view shows of a report: its rich text in rich-text mode, else its own. Nothing when there is no memory for
+/// a copy.
+std::optional<QString> shownText(const UReportDoc &report);
 
-/// The characters that a view shows of a report, its lines ended by CR LF: of rich text those of the document.
+/// The characters that a view shows of a report, its lines ended by CR LF: of rich text those of the document. Empty when
+/// there is no memory for them.
 QString shownPlainText(const UReportDoc &report);
 
 /// Reads the shown text of a report that is rich text into a document. What was loaded from a file is read as the bytes that

@@ -102,10 +102,10 @@ public:
     /// How often a text took the place of another, in whole or in part. What is only written at the end does not count: it
     /// changes the length.
     quint64 GetEditCount() const;
-    /// A copy of the text, which does not change how the text is kept. Empty when there is no memory for it.
+    /// A copy of the text, which does not change how the text is kept. Null when there is no memory for it, and only then.
     QString CopyText() const;
     /// A copy of a piece of the text: of as many characters of it as there are. @param at  the first character, from 0
-    /// @return empty when there is no memory for it
+    /// @return null when there is no memory for it, and only then
     QString CopyText(qint64 at, qint64 count) const;
     /// Empties the report. The next line written begins page 1.
     virtual void Clear();
@@ -159,8 +159,8 @@ public:
     static bool ResetFormatString(QString &document);
     /// Adds a piece of text in a style to the image, or a line end for an empty text; nothing while rich-text mode is off.
     void WriteRTFData(const QString &text, int style);
-    /// The whole rich-text document; in external-Excel mode only the texts that were written. Empty when there is no memory
-    /// for it.
+    /// The whole rich-text document; in external-Excel mode only the texts that were written. Null when there is no memory
+    /// for it, and only then.
     void GetRTFData(QString &document) const;
     /// The font table of the document.
     void GetFontTableData(QString &table) const;

@@ -32,8 +32,9 @@ void UReportDoc::WriteRTFData(const QString &text, int style)
 void UReportDoc::GetRTFData(QString &document) const
 {
     document = kareport::whileMemoryLasts(QString(), [this] {
-        return parts_->mirrors.image.document(parts_->layout.fontName, parts_->layout.fontSize,
-                                              parts_->mirrors.imageForm);
+        const QString image =
+            parts_->mirrors.image.document(parts_->layout.fontName, parts_->layout.fontSize, parts_->mirrors.imageForm);
+        return image.isEmpty() ? QStringLiteral("") : image;
     });
 }
 

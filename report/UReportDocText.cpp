@@ -47,8 +47,9 @@ QString UReportDoc::CopyText(qint64 at, qint64 count) const
 {
     const kareport::ReportText &text = parts_->page.text();
     const qint64 first = std::clamp<qint64>(at, 0, text.size());
-    return kareport::whileMemoryLasts(
-        QString(), [&] { return text.piece(first, std::clamp<qint64>(count, 0, text.size() - first)); });
+    const qint64 size = std::clamp<qint64>(count, 0, text.size() - first);
+    return size == 0 ? QStringLiteral("")
+                     : kareport::whileMemoryLasts(QString(), [&] { return text.piece(first, size); });
 }
 
 QString UReportDoc::CopyText() const

@@ -46,6 +46,7 @@ void CReportToolBar::showTips()
         if (OnUserToolTip(button, tip)) {
             button->setText(tip);
             button->setToolTip(tip);
+            button->setStatusTip(tip);
             widgetForAction(button)->setAccessibleName(tip);
         }
     }
@@ -56,13 +57,15 @@ bool CReportToolBar::OnShowControlBarMenu(const QPoint & /*point*/) const
     return false;
 }
 
-void CReportToolBar::OnUpdateCmdUI(UXTPMDIFrameWnd * /*frame*/, bool /*disableIfNoHandler*/)
+void CReportToolBar::OnUpdateCmdUI(UXTPMDIFrameWnd * /*frame*/, bool disableIfNoHandler)
 {
     const kareport::CommandTarget *asked = target();
     for (QAction *button : actions()) {
         kareport::CommandState state;
         const bool known = asked != nullptr && asked->updateCommand(button->data().toUInt(), state);
-        button->setEnabled(known && state.enabled);
+        if (known || disableIfNoHandler) {
+            button->setEnabled(known && state.enabled);
+        }
     }
 }
 

@@ -3,6 +3,7 @@
 #include "UReportWindowDlg.h"
 
 #include "AppMessageBox.h"
+#include "CPropertyPane.h"
 #include "CViewPane.h"
 #include "ReportEntry.h"
 #include "ReportGuards.h"
@@ -119,6 +120,10 @@ void UReportWindowDlg::ShowReport()
             reportTemplate->InitialUpdatePane(pane, report, 1);
             kareport::noteOwnPane(*pane, true);
             kareport::closeOwnHiddenPanes(*report); // the report is now in one that is shown
+            // The pane in front is the new one: the report's first pane may be one that the host has hidden.
+            report->UDocument::UpdateAllViews(nullptr, 0, nullptr);
+            CPropertyPane::UpdateAllPropertyPane(UReportDoc::IsReportAvailable(report) ? report : nullptr);
+            return;
         }
     }
     report->UpdateAllViews(nullptr, 0, nullptr);

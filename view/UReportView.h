@@ -78,7 +78,8 @@ public:
     int OnCreate();
     void OnInitialUpdate() override;
     void OnUpdate(UView *sender, long hint, void *hintObject) override;
-    /// Loads the control from the document, or the document from the control.
+    /// Loads the control from the document, or the document from the control. Without memory for a copy of the document's
+    /// text the control keeps what it shows, and nothing can be edited or taken from it until an update finds the memory.
     void UpdateData(bool toView);
     /// Replaces the control's content by a text, plain or rich as it begins.
     void SetRTFText(const QString &text);
@@ -176,11 +177,14 @@ private:
     /// After the last character that is printed.
     qint64 endOf(const kareport::PrintInfo &info) const;
     qreal usualScale() const;
+    bool measureRoom();
+    void showMeasuredPage();
     void print(kareport::PrintInfo &info);
     std::vector<kareport::Command> makeCommands();
     void takeEdit(const kareport::ReportChange &change);
     void followEdit(const kareport::ReportChange &change);
     void noteLoaded();
+    void noteUnread();
     void noteShown();
     bool isStale() const; ///< whether the document has changed since, and the view was not notified
 
@@ -189,6 +193,7 @@ private:
     std::vector<kareport::Command> commands_;
     WordWrap m_nWordWrap = WrapNone;
     bool loadsInPieces_ = false;
+    bool isUnread_ = false;     ///< whether there was no memory to show the document: nothing can be edited
     bool isMirrored_ = false;   ///< whether the document holds the control's text, its lines ended by CR LF
     qint64 loadedLength_ = -1;  ///< the document's length when the control was loaded from it or it from the control
     quint64 mirroredEdits_ = 0; ///< the document's edits by then

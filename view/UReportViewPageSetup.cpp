@@ -39,13 +39,19 @@ void UReportView::OnPageSetup()
     report->UseGivenPage(setup.keepsGivenPages);
     report->SetPageSize();
     report->SaveSettings();
-    for (UView *view : report->GetViews()) {
+    showMeasuredPage();
+    // After the measurement, which the next print command repeats: the report that is open keeps its pages until then.
+    SetReportPrinterSetToPortrait(UPreviewDlg::IsModulePrinterOrientationPortrait());
+}
+
+/// After the page was measured: every view of the report shows what page a place is on.
+void UReportView::showMeasuredPage()
+{
+    for (UView *view : GetDocument()->GetViews()) {
         auto *shown = dynamic_cast<UReportView *>(view);
         if (shown != nullptr && shown->widget_) {
             static_cast<kareport::ReportViewWidget *>(shown->widget_.data())->showPlace();
             shown->OnPagesForgotten();
         }
     }
-    // After the measurement, which the next print command repeats: the report that is open keeps its pages until then.
-    SetReportPrinterSetToPortrait(UPreviewDlg::IsModulePrinterOrientationPortrait());
 }

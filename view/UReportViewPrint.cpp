@@ -60,17 +60,6 @@ void sayNoRoom()
     AppMessageBox(Xlate("The margins leave no room for text on the paper. Choose smaller margins under Page Setup."));
 }
 
-/// Matches the page model with the printer.
-/// @return whether the page has room for text. Also where there is no printer: preparing the job says so
-bool measureRoom(UReportDoc &report)
-{
-    if (report.SetPageSize() == 0) {
-        return true;
-    }
-    const QSize sheet = kareport::twipsOfDots(report.GetPageSize(), report.GetPrintResolution());
-    return kareport::leavesRoom(sheet, kareport::twipsOfHundredths(report.GetMargins()));
-}
-
 PrintOutcome printText(UReportView &view, QPrinter &printer, PrintInfo &info, int lastPage)
 {
     const PrintedText text(view);
@@ -125,10 +114,24 @@ QString nameOf(const QPrinter &printer)
 
 } // namespace
 
+/// Matches the page model with the printer.
+/// @return whether the page has room for text. Also where there is no printer: preparing the job says so
+bool UReportView::measureRoom()
+{
+    UReportDoc &report = *GetDocument();
+    const int isMeasured = report.SetPageSize();
+    showMeasuredPage();
+    if (isMeasured == 0) {
+        return true;
+    }
+    const QSize sheet = kareport::twipsOfDots(report.GetPageSize(), report.GetPrintResolution());
+    return kareport::leavesRoom(sheet, kareport::twipsOfHundredths(report.GetMargins()));
+}
+
 void UReportView::OnReportPrint(bool direct)
 {
     // Where the user is asked, another sheet may be chosen.
-    if (GetDocument() != nullptr && !measureRoom(*GetDocument()) && direct) {
+    if (GetDocument() != nullptr && !measureRoom() && direct) {
         sayNoRoom();
         return;
     }
@@ -144,7 +147,7 @@ void UReportView::OnPrintSelection()
     if (GetDocument() == nullptr || !cursor.hasSelection()) {
         return;
     }
-    measureRoom(*GetDocument()); // another sheet may be chosen
+    measureRoom(); // another sheet may be chosen
     const auto orientation = kareport::reportOrientation();
     const QTextDocument &text = *GetEdit().document();
     const QTextBlock last = text.findBlock(cursor.selectionEnd());
@@ -169,7 +172,7 @@ void UReportView::print(PrintInfo &info)
 
 void UReportView::OnReportPrintPreview()
 {
-    if (GetDocument() != nullptr && !measureRoom(*GetDocument())) {
+    if (GetDocument() != nullptr && !measureRoom()) {
         sayNoRoom();
         return;
     }

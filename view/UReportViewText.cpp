@@ -8,6 +8,9 @@
 
 #include <QTextDocument>
 
+#include <optional>
+#include <utility>
+
 using kareport::ReportChange;
 using kareport::ReportEdit;
 
@@ -50,11 +53,19 @@ void UReportView::UpdateData(bool toView)
         return;
     }
     if (!toView) {
+        if (isUnread_) {
+            return;
+        }
         takeText();
         report->UpdateAllViews(this, 0, nullptr);
         return;
     }
-    const QString text = kareport::shownText(*report);
+    const std::optional<QString> shown = kareport::shownText(*report);
+    if (!shown) {
+        noteUnread();
+        return;
+    }
+    const QString &text = *shown;
     const WordWrap wrap = kareport::isRichText(text) ? WrapToWindow : WrapNone;
     if (m_nWordWrap != wrap) {
         m_nWordWrap = wrap;
@@ -68,8 +79,24 @@ void UReportView::UpdateData(bool toView)
     forgetPages();
 }
 
+/// There was no memory for the report's text. What the control shows is another one: an edit of that would take the report's
+/// place. The next update tries again.
+void UReportView::noteUnread()
+{
+    edit_->stopLoading();
+    edit_->setReadOnly(true);
+    edit_->document()->setUndoRedoEnabled(false);
+    isUnread_ = true;
+    isMirrored_ = false;
+    loadedLength_ = -1;
+    forgetPages();
+}
+
 void UReportView::noteLoaded()
 {
+    if (std::exchange(isUnread_, false)) {
+        edit_->setReadOnly(false);
+    }
     loadedLength_ = GetDocument()->GetTextLength();
     mirroredEdits_ = GetDocument()->GetEditCount();
 }
@@ -166,7 +193,7 @@ void UReportView::SetRTFText(const QString &text)
 void UReportView::OnChange()
 {
     UReportDoc *report = GetDocument();
-    if (report != nullptr && widget_) {
+    if (report != nullptr && widget_ && !isUnread_) {
         takeText();
         report->SetModifiedFlag(true); // before others hear of it: an editor that takes it may close the report
         report->UpdateAllViews(this, 0, nullptr);
@@ -176,7 +203,7 @@ void UReportView::OnChange()
 void UReportView::takeEdit(const ReportChange &change)
 {
     UReportDoc *report = GetDocument();
-    if (report == nullptr) {
+    if (report == nullptr || isUnread_) {
         return;
     }
     const bool isReplaced =
@@ -208,8 +235,9 @@ void UReportView::followEdit(const ReportChange &change)
         return; // it has followed already, in a view that was notified of the same edit twice
     }
     // A view that shows formats, or an image, shows another text than the one that was edited: what the document holds now
-    // is plain.
-    if (!showsFormats_ && edit_->applyChange(change)) {
+    // is plain. An edit of its head may have made it rich text.
+    const bool isRich = change.documentPosition() < longestRichTextHead && report->HoldsRichTextSource();
+    if (!showsFormats_ && !isUnread_ && !isRich && edit_->applyChange(change)) {
         noteMirrored();
         followPages(change);
         return;

@@ -1,6 +1,7 @@
 #include "LandXmlTexts.h"
 
 #include "FixedNotation.h"
+#include "TextBuffer.h"
 #include "UFormatAngle.h"
 #include "UFormatBearing.h"
 #include "VariableType.h"
@@ -32,9 +33,23 @@ QString bearingText(double shown, const UJobSettings &settings)
     return text;
 }
 
+QString lengthText(double shown, const UJobSettings &settings)
+{
+    TextBuffer text;
+    settings.appendUnitLength(text, shown, {});
+    return text.view().toString();
+}
+
+QString stationText(double shown, const UJobSettings &settings)
+{
+    TextBuffer text;
+    settings.appendStation(text, shown, {.alignRight = true, .showSign = true});
+    return text.view().toString();
+}
+
 QString offsetText(double shown, const UJobSettings &settings)
 {
-    const QString text = settings.UnitLengthToString(std::fabs(shown), false, false, -1, -1, false);
+    const QString text = lengthText(std::fabs(shown), settings);
     return shown < 0 ? text + u'L' : shown > 0 ? text + u'R' : text;
 }
 
@@ -49,12 +64,8 @@ std::optional<QString> landXmlText(double value, int type, const UJobSettings &s
     case VARIABLE_LENGTH:
     case VARIABLE_DISTANCE:
     case VARIABLE_COORDINATE:
-    case VARIABLE_ELEVATION:
-        return isInfinite ? infinite : settings.UnitLengthToString(shown, false, false, -1, -1, false);
-    case VARIABLE_STATION:
-        return isInfinite ? infinite
-                          : settings.StationToString(shown, false, false, false, -1, -1, false, false, false, true,
-                                                     false, true);
+    case VARIABLE_ELEVATION: return isInfinite ? infinite : lengthText(shown, settings);
+    case VARIABLE_STATION: return isInfinite ? infinite : stationText(shown, settings);
     case VARIABLE_OFFSET: return isInfinite ? infinite : offsetText(shown, settings);
     case VARIABLE_AREA:
     case VARIABLE_ANGLE:

@@ -90,10 +90,17 @@ private:
             dialog->reject();
             return;
         }
+        auto *field = dialog->findChild<QLineEdit *>(QStringLiteral("fileNameEdit"));
+        if (!field->hasFocus()) {
+            // A user types where the keyboard is. A text that is set elsewhere selects the file that it names, and the
+            // dialog then shows the selected file's name without its folder.
+            dialog->activateWindow();
+            field->setFocus();
+            return;
+        }
         if (!kind.isEmpty()) {
             dialog->selectNameFilter(kind);
         }
-        auto *field = dialog->findChild<QLineEdit *>(QStringLiteral("fileNameEdit"));
         field->setText(typed.takeFirst());
         QTest::keyClick(field, Qt::Key_Return);
     }

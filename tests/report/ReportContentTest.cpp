@@ -34,6 +34,33 @@ TEST(ReportContent, TheFontIsOfFixedPitchAlsoWhereTheFaceIsMissing)
     EXPECT_GT(reportFont(QStringLiteral("Lucida Console"), 0).pointSize(), 0) << "a size of 0 is ignored";
 }
 
+TEST(ReportContent, AFacesNameIsOf31CharactersAtMost)
+{
+    struct Row
+    {
+        qsizetype given;
+        qsizetype taken;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {30, 30, "shorter"},
+        {31, 31, "the longest"},
+        {32, 31, "the first 31 of one more"},
+        {300, 31, "and of many more"},
+    };
+    const FixedSurroundings surroundings;
+    QTextDocument document;
+    for (const Row &row : rows) {
+        const QString name = QString(row.given, u'x');
+        UReportDoc report;
+        report.SetFontName(name);
+        report.SetData(QStringLiteral("x"));
+        showReportContent(report, document);
+        EXPECT_EQ(document.defaultFont().families().value(0), name.left(row.taken)) << row.reason;
+        EXPECT_EQ(report.GetFontName(), name) << "the document keeps what was given: " << row.reason;
+    }
+}
+
 TEST(ReportContent, WhatBeginsAsRichTextIsShownAsSuch)
 {
     struct Row
@@ -81,14 +108,14 @@ TEST(ReportContent, AnOpenedRichTextIsReadWithItsCodePage)
     EXPECT_FALSE(showReportContent(report, document));
     EXPECT_TRUE(document.toPlainText().startsWith(QStringLiteral("При"))) << document.toPlainText().toStdString();
     QTextDocument viewed;
-    EXPECT_FALSE(kareport::readShownRichText(report, kareport::shownText(report), viewed));
+    EXPECT_FALSE(kareport::readShownRichText(report, kareport::shownText(report).value(), viewed));
     EXPECT_EQ(viewed.toPlainText(), document.toPlainText()) << "a view reads it in the same way";
 
     // The image of what is written afterwards is text of its own: a character beyond one byte is not one of a file.
     report.SetRTFDataFlag(true);
     report.Write(QStringLiteral("r = \u221E"), 0);
     viewed.clear();
-    EXPECT_FALSE(kareport::readShownRichText(report, kareport::shownText(report), viewed));
+    EXPECT_FALSE(kareport::readShownRichText(report, kareport::shownText(report).value(), viewed));
     EXPECT_TRUE(viewed.toPlainText().contains(u'\u221E')) << viewed.toPlainText().toStdString();
 }
 

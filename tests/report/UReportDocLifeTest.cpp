@@ -289,4 +289,22 @@ TEST(UReportDocLife, ANewReportIsMeasuredAndUnmodified)
     EXPECT_EQ(unmeasured.GetLinesPerPage(), 72);
 }
 
+TEST(UReportDocLife, ANewReportThatCannotBeEmptiedIsNotMeasured)
+{
+    /// Has no memory for being emptied.
+    class FullReport : public UReportDoc
+    {
+    public:
+        void DeleteContents() override { throw std::bad_alloc(); }
+    };
+    const FixedSurroundings surroundings;
+    FullReport report;
+    const unsigned resolution = report.GetPrintResolution();
+    ASSERT_NE(resolution, 600U);
+    report.SetModifiedFlag(true);
+    EXPECT_FALSE(report.OnNewDocument());
+    EXPECT_EQ(report.GetPrintResolution(), resolution);
+    EXPECT_TRUE(report.IsModified()) << "it is what it was";
+}
+
 } // namespace

@@ -207,6 +207,20 @@ TEST(UReportDocSaveDialog, BeginsInTheFolderUsedLast)
     EXPECT_EQ(dialog.requests.back().initialFolder, QString()) << "a folder that is gone";
 }
 
+TEST(UReportDocSaveDialog, TheFolderIsKeptThoughTheSaveFails)
+{
+    const FixedSurroundings surroundings;
+    const QTemporaryDir folder;
+    const QString taken = folder.filePath(QStringLiteral("a.rep"));
+    ASSERT_TRUE(QDir().mkdir(taken)); // a folder has the name
+    const AnsweredDialog dialog(taken);
+    WriteProfileString(QString(), folderEntry, QStringLiteral("/jobs"));
+    UReportDoc report;
+    report.WriteLine(QStringLiteral("x"), 0, 1, 0);
+    EXPECT_FALSE(report.DoSave(QString(), true));
+    EXPECT_EQ(GetProfileString(QString(), folderEntry), folder.path()) << "it is where the user looked";
+}
+
 TEST(UReportDocSaveDialog, CancellingChangesNothing)
 {
     const FixedSurroundings surroundings;

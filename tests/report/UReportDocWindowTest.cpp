@@ -157,6 +157,55 @@ TEST(UReportDocWindow, AnotherNameIsWrittenIntoTheReport)
     }
 }
 
+/// Writes down what its report is when it is called.
+class WitnessWindow : public TestReportWindow
+{
+public:
+    void WriteLine(const QString &piece) override { seen += piece.trimmed() + QStringLiteral(" under ") + state(); }
+    bool createDocked(const QString &caption, UView *previousView) override
+    {
+        seen += QStringLiteral("create: ") + state();
+        return TestReportWindow::createDocked(caption, previousView);
+    }
+    void setActive(bool active) override
+    {
+        seen += (active ? QStringLiteral("active: ") : QStringLiteral("not active: ")) + state();
+    }
+
+    UReportDoc *report = nullptr;
+    QStringList seen;
+
+private:
+    QString state() const
+    {
+        return QStringLiteral("%1, %2, %3, %4")
+            .arg(report->GetTitle(), report->GetReportFileName(),
+                 report->GetHeaderFlag() ? QStringLiteral("headers") : QStringLiteral("none"),
+                 report->GetFrameWindow()->IsVisible() ? QStringLiteral("shown") : QStringLiteral("hidden"));
+    }
+};
+
+TEST(UReportDocWindow, AnotherRunGoesStepByStep)
+{
+    WindowedReport t(QStringLiteral("First"));
+    delete t.window;
+    auto *window = new WitnessWindow;
+    t.window = window;
+    window->created = false;
+    window->report = t.report;
+    t.report->SetReportWindow(window);
+    ASSERT_TRUE(t.report->GetFrameWindow()->IsVisible());
+    t.report->UpdateReportInfo(QStringLiteral("Second"), true, false);
+    window->seen.removeIf([](const QString &piece) {
+        return piece.startsWith(QStringLiteral(" under ")) || piece.startsWith(QStringLiteral("TALVEN - "));
+    });
+    EXPECT_EQ(window->seen, (QStringList{QStringLiteral("create: First, First, headers, hidden"),
+                                         QStringLiteral("not active: First, First, headers, hidden"),
+                                         QStringLiteral("Second under First, First, headers, hidden")}))
+        << "the pane is hidden and the flags are set before the window is there; the name is written before it is the title";
+    EXPECT_EQ(t.report->GetTitle(), QStringLiteral("Second"));
+}
+
 TEST(UReportDocWindow, WithoutANameTheTitleStays)
 {
     WindowedReport t(QStringLiteral("Traverse"));

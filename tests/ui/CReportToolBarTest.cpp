@@ -182,6 +182,7 @@ TEST(CReportToolBar, AHostMayNameTheButtons)
     bar.show();
     EXPECT_EQ(buttonOf(bar, 0)->toolTip(), QStringLiteral("Keep"));
     EXPECT_EQ(buttonOf(bar, 0)->accessibleName(), QStringLiteral("Keep"));
+    EXPECT_EQ(buttonOf(bar, 0)->defaultAction()->statusTip(), QStringLiteral("Keep")) << "in the status bar as well";
     EXPECT_EQ(buttonOf(bar, 1)->toolTip(), QStringLiteral("View\\Edit Report"));
     EXPECT_EQ(buttonOf(bar, 2)->toolTip(), QStringLiteral("Print")) << "left as it was";
 }
@@ -216,6 +217,8 @@ TEST(CReportToolBar, ACommandThatTheOwnerDoesNotHandleIsDisabled)
     bar.OnUpdateCmdUI(&frame, true);
     EXPECT_EQ(enabledIn(bar), (std::array<bool, 3>{true, true, true}));
     owner.removeHandlers();
+    bar.OnUpdateCmdUI(&frame, false);
+    EXPECT_EQ(enabledIn(bar), (std::array<bool, 3>{true, true, true})) << "unless it is asked to, it leaves such a one";
     bar.OnUpdateCmdUI(&frame, true);
     EXPECT_EQ(enabledIn(bar), (std::array<bool, 3>{})) << "although the frame handles it";
     buttonOf(bar, 0)->defaultAction()->setEnabled(true);

@@ -1,3 +1,4 @@
+#include "BracketTranslator.h"
 #include "PrintFixture.h"
 #include "ReportWindowFixture.h"
 
@@ -95,6 +96,19 @@ TEST_F(ReportWindowCommands, SavingAsksForAFile)
     EXPECT_FALSE(isEnabled(11007));
     EXPECT_EQ(report->GetPathName(), QString()) << "the file does not become the report's own";
     EXPECT_TRUE(window.isCreated()) << "the window stays open";
+}
+
+TEST_F(ReportWindowCommands, TheKindsOfFilesAreTranslated)
+{
+    const AnsweredSaving saving(std::nullopt);
+    {
+        const BracketTranslator translator;
+        window.OnSave();
+    }
+    ASSERT_EQ(saving.requests.size(), 1U);
+    EXPECT_TRUE(saving.requests.front().filter.startsWith(
+        QStringLiteral("[Report Files (*.rep)|*.rep|RTF Files (*.rtf)|*.rtf|PDF (*.pdf)|*.pdf|]")))
+        << saving.requests.front().filter.toStdString();
 }
 
 TEST_F(ReportWindowCommands, TheEndingOfTheNameSaysTheKindOfFile)

@@ -39,6 +39,10 @@ TEST_F(ReportWindowShow, APaneThatTheHostHidesStays)
     CViewPane *own = report->GetFrameWindow();
     window.ShowReport();
     EXPECT_TRUE(CViewPane::IsOpen(host)) << "which the host has not shown yet";
+    EXPECT_FALSE(host->IsVisible()) << "and which stays hidden";
+    ASSERT_NE(activeView(), nullptr);
+    EXPECT_EQ(activeView()->GetDocument(), report);
+    EXPECT_NE(activeView()->GetParentPane(), host) << "the new one is in front";
     EXPECT_FALSE(CViewPane::IsOpen(own)) << "the report's own hidden one has given way";
     EXPECT_EQ(report->GetViews().size(), 2U);
 }

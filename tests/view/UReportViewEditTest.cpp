@@ -193,6 +193,21 @@ TEST(UReportViewEdit, TwoViewsFollowEachOther)
     EXPECT_EQ(first.GetEdit().toPlainText(), t.lines()) << "an undone edit is an edit";
 }
 
+TEST(UReportViewEdit, AnEditThatMakesATextRichTextIsShownSoInOtherViews)
+{
+    ShownReport t(QStringLiteral("rtf1 one{\\b two}}"));
+    UReportView &first = t.open();
+    UReportView &second = t.open();
+    putCursor(first.GetEdit(), 0);
+    for (const char key : {'{', '\\'}) {
+        QTest::keyClick(&first.GetEdit(), key);
+    }
+    EXPECT_EQ(first.GetEdit().toPlainText(), t.lines()) << "the user goes on typing in the source";
+    EXPECT_EQ(second.GetEdit().toPlainText(), QStringLiteral("onetwo"));
+    QTest::keyClick(&first.GetEdit(), Qt::Key_Backspace);
+    EXPECT_EQ(second.GetEdit().toPlainText(), t.lines()) << "and back";
+}
+
 TEST(UReportViewEdit, OneViewClosesWhileTheOtherEdits)
 {
     ShownReport t(QStringLiteral("one\r\n"));

@@ -50,6 +50,27 @@ TEST(UReportViewPageSetup, OkMeasuresThePageWithTheNewMargins)
     EXPECT_LT(report.report.GetLinesPerPage(), before * 2 / 3);
 }
 
+TEST(UReportViewPageSetup, TheOpenReportIsTurnedWithItsNextPrint)
+{
+    AnsweredPrinting printing;
+    ShownReport report(QStringLiteral("line\r\n").repeated(300));
+    UReportView &view = report.open();
+    UReportView &other = report.open();
+    SetReportPrinterSetToPortrait(true);
+    report.report.SetPageSize();
+    const QSize upright = report.report.GetPageSize();
+    const int lines = report.report.GetLinesPerPage();
+    printing.changeSetup = [](kareport::PageSetup &setup) { setup.portrait = false; };
+    view.OnPageSetup();
+    EXPECT_EQ(report.report.GetPageSize(), upright) << "it is measured before the orientation is kept";
+    EXPECT_EQ(report.report.GetLinesPerPage(), lines);
+    const QString shown = widgetOf(other).pageLabel().text();
+    view.OnReportPrint();
+    EXPECT_EQ(report.report.GetPageSize(), upright.transposed()) << "and by the next print command";
+    EXPECT_LT(report.report.GetLinesPerPage(), lines);
+    EXPECT_NE(widgetOf(other).pageLabel().text(), shown) << "each view shows at once how many pages there are";
+}
+
 TEST(UReportViewPageSetup, CancelChangesNothing)
 {
     AnsweredPrinting printing;
