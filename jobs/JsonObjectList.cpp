@@ -1,5 +1,6 @@
 #include "JsonObjectList.h"
 
+#include "EntryOrder.h"
 #include "TextFolding.h"
 #include "Xlate.h"
 
@@ -7,6 +8,8 @@
 #include <QVariant>
 
 #include <algorithm>
+#include <compare>
+#include <memory>
 #include <utility>
 
 namespace kareport
@@ -26,7 +29,7 @@ bool storeNumber(const ValueParser &parser, const QJsonValue &value, UDataObject
 } // namespace
 
 void storeJsonObject(const JsonNode &node, const FindVariable &findVariable, UDataObject &object,
-                     const SeeMember &seeMember)
+                     const SeeMember &seeMember, const SeeReplacing &seeReplacing)
 {
     if (!node.expectObject()) {
         return;
@@ -47,6 +50,8 @@ void storeJsonObject(const JsonNode &node, const FindVariable &findVariable, UDa
         }
         names.insert(foldedKey(name));
         const QJsonValue &value = member.value();
+        const UDictEntry *held = seeReplacing ? object.Find(parser->id()) : nullptr;
+        const auto before = held != nullptr ? std::make_unique<UDictEntry>(*held) : nullptr;
         bool fits = false;
         switch (value.type()) {
         case QJsonValue::Null: fits = true; break;
@@ -63,6 +68,9 @@ void storeJsonObject(const JsonNode &node, const FindVariable &findVariable, UDa
             member.fail(Xlate("the value of \"%1\" does not fit: %2 was expected").arg(name, parser->expected()));
             return;
         }
+        if (before && std::is_neq(compareEntries(&*before, object.Find(parser->id())))) {
+            seeReplacing(member, name, parser->id());
+        }
     }
 }
 
@@ -74,6 +82,9 @@ JsonObjectList::JsonObjectList(const JsonSource &source, const JsonPath &path, c
     const SeeMember seeMember = [&](const JsonNode &member, const QString &name, const ValueParser *parser) {
         noteMember(source, member, name, parser);
     };
+    const SeeReplacing seeReplacing = [&](const JsonNode &member, const QString &name, unsigned id) {
+        noteReplaced(source, member, name, id);
+    };
     JsonNode values(source, error_);
     for (const auto &step : path) {
         const auto *name = std::get_if<QString>(&step);
@@ -82,13 +93,24 @@ JsonObjectList::JsonObjectList(const JsonSource &source, const JsonPath &path, c
     isObject_ = values.isObject();
     hasRow_ = isObject_ || values.size() > 0;
     if (isObject_) {
-        storeJsonObject(values, findVariable, Add(), seeMember);
+        storeJsonObject(values, findVariable, Add(), seeMember, seeReplacing);
         return;
     }
     const qsizetype count = firstOnly ? std::min<qsizetype>(values.size(), 1) : values.size();
     for (qsizetype i = 0; i < count && !error_; ++i) {
-        storeJsonObject(values[i], findVariable, Add(), seeMember);
+        storeJsonObject(values[i], findVariable, Add(), seeMember, seeReplacing);
     }
+}
+
+/// Says once for an identifier that one value of a row takes the place of another.
+void JsonObjectList::noteReplaced(const JsonSource &source, const JsonNode &member, const QString &name, unsigned id)
+{
+    if (std::find(replacedIds_.begin(), replacedIds_.end(), id) != replacedIds_.end()) {
+        return;
+    }
+    replacedIds_.push_back(id);
+    const QString text = Xlate("a row has values of several variables that have one ID: that of \"%1\" is shown");
+    differences_.push_back(source.errorAt(member.path(), text.arg(name), true));
 }
 
 /// Keeps the name of a member, once, where it is first met.

@@ -2458,6 +2458,11 @@
         <translation>unbekannter Schlüssel "%1": erwartet: %2</translation>
     </message>
     <message>
+        <location filename="../jobs/JsonObjectList.cpp"/>
+        <source>a row has values of several variables that have one ID: that of "%1" is shown</source>
+        <translation>eine Zeile hat Werte mehrerer Variablen, die eine ID haben: der von "%1" erscheint</translation>
+    </message>
+    <message>
         <location filename="../jobs/JsonSource.cpp"/>
         <source>the key "%1" occurs twice in "%2"</source>
         <translation>der Schlüssel „%1“ kommt in „%2“ zweimal vor</translation>

@@ -2458,6 +2458,11 @@
         <translation>不明なキー "%1": 使用できるキー: %2</translation>
     </message>
     <message>
+        <location filename="../jobs/JsonObjectList.cpp"/>
+        <source>a row has values of several variables that have one ID: that of "%1" is shown</source>
+        <translation>ID が同じ複数の変数に値がある行があります: "%1" の値が表示されます</translation>
+    </message>
+    <message>
         <location filename="../jobs/JsonSource.cpp"/>
         <source>the key "%1" occurs twice in "%2"</source>
         <translation>キー「%1」が「%2」に 2 回あります</translation>

@@ -136,4 +136,36 @@ TEST(HostSaves, AJobWhoseNotesCannotBeWrittenDoesNotEndAsDone)
     EXPECT_GE(notesFailed, 2) << "the notes alone";
 }
 
+TEST(HostSaves, ANewJobIsThereWithAllItsFilesOrNotAtAll)
+{
+    const QTemporaryDir folder;
+    kareport::NewCommand command;
+    command.folder = folder.filePath(QStringLiteral("survey"));
+    command.quiet = true;
+    const QDir made(command.folder);
+    int failed = 0;
+    for (const FailingFiles::Call call : {FailingFiles::Call::Write, FailingFiles::Call::ShortWrite}) {
+        bool hasFailed = true;
+        for (qint64 number = 1; hasFailed && !HasFailure(); ++number) {
+            SCOPED_TRACE(std::string(failingCallNames[static_cast<int>(call)]) + " " + std::to_string(number));
+            testing::internal::CaptureStderr();
+            auto status = kareport::exitDone;
+            {
+                const FailingFiles failing(call, number);
+                status = command.run();
+                hasFailed = failing.hasFailed();
+            }
+            const std::string said = testing::internal::GetCapturedStderr();
+            EXPECT_EQ(status, hasFailed ? kareport::exitOutput : kareport::exitDone) << said;
+            EXPECT_EQ(made.exists(), !hasFailed) << "nothing is left of it";
+            EXPECT_EQ(said.find("could not be written") != std::string::npos, hasFailed) << said;
+            EXPECT_EQ(said.find(made.path().toStdString()) != std::string::npos, hasFailed) << said;
+            failed += hasFailed ? 1 : 0;
+        }
+        EXPECT_EQ(made.entryList(QDir::Files).size(), 3) << "the template, the data and the job";
+        EXPECT_TRUE(QDir(command.folder).removeRecursively());
+    }
+    EXPECT_GE(failed, 6) << "each of the files, each way";
+}
+
 } // namespace

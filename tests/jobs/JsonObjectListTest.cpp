@@ -214,6 +214,42 @@ TEST(JsonObjectList, HasTheObjectsAsRowsUntilOneIsWrong)
     }
 }
 
+TEST(JsonObjectList, AValueInThePlaceOfAnotherOneIsNotedOnce)
+{
+    struct Row
+    {
+        const char *rows;
+        const char *note; ///< with its place; empty for none
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {R"([{"A":1},{"B":2}])", "", "each row has one"},
+        {R"([{"A":1,"B":1}])", "", "both are the same"},
+        {R"([{"A":1,"B":null}])", "", "null is no value"},
+        {R"([{"A":1,"B":2},{"A":3,"B":4}])",
+         R"(job.json:1:14: note: a row has values of several variables that have one ID: that of "B" is shown)",
+         "the first row that has two"},
+        {R"([{"B":2,"A":1}])",
+         R"(job.json:1:8: note: a row has values of several variables that have one ID: that of "B" is shown)",
+         "members have no order of their own"},
+        {R"({"A":1,"B":2})",
+         R"(job.json:1:13: note: a row has values of several variables that have one ID: that of "B" is shown)",
+         "a single row"},
+    };
+    const auto findVariable = [](const QString &name) -> std::optional<ValueParser> {
+        return name == u"A" || name == u"B" ? std::optional(ValueParser(VARIABLE_LENGTH, id, {})) : std::nullopt;
+    };
+    for (const Row &row : rows) {
+        auto read = JsonSource::fromBytes(QStringLiteral("job.json"), "{\"v\":" + QByteArray(row.rows) + '}');
+        ASSERT_EQ(errorOf(read), nullptr);
+        kareport::JsonObjectList list(std::get<JsonSource>(read), {QStringLiteral("v")}, findVariable, false, {});
+        const auto notes = list.differences();
+        ASSERT_EQ(notes.size(), *row.note == 0 ? 0U : 1U) << row.reason;
+        EXPECT_EQ(notes.empty() ? QString() : notes[0].messageAs(QStringLiteral("note")), QLatin1StringView(row.note))
+            << row.reason;
+    }
+}
+
 TEST(JsonObjectList, EndsWhenTheWorkIsStopped)
 {
     QByteArray json = R"({"data": {"d": {"values": [{"V": 1})";
