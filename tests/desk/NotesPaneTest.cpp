@@ -209,4 +209,30 @@ TEST(FilePlace, ReadsNoMoreThanAWindowNeeds)
     EXPECT_FALSE(kareport::readLinesAround(folder.path(), 1, read)) << "a folder";
 }
 
+TEST(NotesPane, GivesTheKeyboardBackToTheReport)
+{
+    struct Row
+    {
+        void (*leave)(NotedDesk &desk);
+        bool isOpen; ///< afterwards
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {[](NotedDesk &desk) { QTest::keyClick(&desk.list(), Qt::Key_Escape); }, true, "Escape"},
+        {[](NotedDesk &desk) { desk.pane().close(); }, false, "its close button"},
+        {[](NotedDesk &desk) { desk.frame->OnCommand(kareport::viewNotesCommand); }, false, "View > Notes"},
+    };
+    NotedDesk desk;
+    ASSERT_NE(desk.report, nullptr);
+    for (const Row &row : rows) {
+        desk.frame->OnCommand(kareport::goToNotesCommand);
+        ASSERT_TRUE(desk.list().hasFocus()) << row.reason;
+        row.leave(desk);
+        EXPECT_EQ(desk.pane().isVisible(), row.isOpen) << row.reason;
+        const auto *view = dynamic_cast<const UReportView *>(desk.frame->GetActiveView());
+        ASSERT_NE(view, nullptr) << row.reason;
+        EXPECT_TRUE(view->GetEdit().hasFocus()) << row.reason;
+    }
+}
+
 } // namespace

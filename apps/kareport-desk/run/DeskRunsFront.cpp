@@ -1,5 +1,6 @@
 #include "DeskRuns.h"
 
+#include "COneViewPane.h"
 #include "DeskCommandIds.h"
 #include "FilePlace.h"
 #include "NotesPane.h"
@@ -66,6 +67,13 @@ NotesPane &DeskRuns::notesPane()
 {
     if (notes_.isNull()) {
         notes_ = new NotesPane(&frame_);
+        notes_->setLeaveHandler([this] {
+            if (UView *view = frame_.GetActiveView()) {
+                view->OnActivateView(true, view, view);
+            } else if (COneViewPane *pane = frame_.GetActivePane()) {
+                frame_.ActivatePane(*pane);
+            }
+        });
         notes_->setGoHandler([this](int number, bool isInFile) { goToNote(number, isInFile); });
         frame_.addDockWidget(Qt::BottomDockWidgetArea, notes_);
         notes_->hide();

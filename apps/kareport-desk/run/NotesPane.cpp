@@ -3,9 +3,11 @@
 #include "PlainWidgets.h"
 #include "Xlate.h"
 
+#include <QApplication>
 #include <QFileInfo>
 #include <QHBoxLayout>
 #include <QHeaderView>
+#include <QKeyEvent>
 #include <QPushButton>
 #include <QTreeWidget>
 #include <QVBoxLayout>
@@ -150,6 +152,26 @@ void NotesPane::open()
         list_->setCurrentItem(list_->topLevelItem(0));
     }
     list_->setFocus(Qt::OtherFocusReason);
+}
+
+void NotesPane::setVisible(bool visible)
+{
+    // Qt would give the keyboard to whatever comes next, as a row of tabs.
+    const QWidget *focus = QApplication::focusWidget();
+    const bool hadKeyboard = !visible && focus != nullptr && isAncestorOf(focus);
+    QDockWidget::setVisible(visible);
+    if (hadKeyboard && leave_) {
+        leave_();
+    }
+}
+
+void NotesPane::keyPressEvent(QKeyEvent *event)
+{
+    if (event->key() == Qt::Key_Escape && leave_) {
+        leave_();
+        return;
+    }
+    QDockWidget::keyPressEvent(event);
 }
 
 void NotesPane::goTo(bool isInFile)
