@@ -63,6 +63,14 @@ protected:
     UReportList list;
 };
 
+TEST_F(ReportListTest, AnEmptyListHasItsVerticalBar)
+{
+    settle();
+    EXPECT_TRUE(list.verticalScrollBar()->isVisible()) << "as with every line that could come";
+    EXPECT_EQ(list.verticalScrollBar()->maximum(), 0);
+    EXPECT_FALSE(list.horizontalScrollBar()->isVisible());
+}
+
 TEST_F(ReportListTest, EveryQuestionIsAnsweredAsIfEachLineHadBeenThereAtOnce)
 {
     EXPECT_EQ(list.GetCount(), 0);

@@ -198,6 +198,19 @@ TEST_F(ReportWindowCommands, ClosingAsksWhenTheReportIsModified)
     }
 }
 
+TEST_F(ReportWindowCommands, TheQuestionIsTranslatedPieceByPiece)
+{
+    const AnsweredBoxes boxes(MessageAnswer::No);
+    window.SetWindowTextW(QStringLiteral("Traverse"));
+    ASSERT_TRUE(report->IsModified());
+    {
+        const BracketTranslator translator;
+        window.OnPressCloseButton();
+    }
+    ASSERT_EQ(boxes.boxes.size(), 1U);
+    EXPECT_EQ(boxes.boxes.front().text, QStringLiteral("[Save changes] [to] Traverse?"));
+}
+
 TEST_F(ReportWindowCommands, ClosingSavesWhenThatIsWanted)
 {
     const QString path = folder.filePath(QStringLiteral("a.rep"));

@@ -26,6 +26,7 @@ TEST_F(ReportWindow, BeginsWithoutAnything)
     window.takeFocus();
     window.UpdateDocumentData();
     window.ActivatePreviousView();
+    window.OnSize(0, 100, 50);
     window.ClosePane();
     EXPECT_FALSE(window.IsVisible());
     ASSERT_TRUE(create());
