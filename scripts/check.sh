@@ -10,8 +10,8 @@ usage: scripts/check.sh [tidy | coverage | fuzz]... [--folder FOLDER]... [--seco
 
 Runs what is named, or all three, and installs what they need. Exit status 1 when one of them has found something.
 
-  tidy       clang-tidy over every source, tests included, folder by folder (build/tidy). Nothing is built: an hour or two the
-             first time; what was clean and has not changed since is not read again
+  tidy       clang-tidy over every source, tests included, folder by folder (build/tidy). Nothing is built, and what was
+             clean and has not changed since is not read again
   coverage   the tests, instrumented (build/coverage): the lines reached in each folder, and a page for each file in
              out/coverage
   fuzz       a minute of each fuzz target under the sanitizers (build/fuzz). New inputs stay in build/fuzz/corpus; one that

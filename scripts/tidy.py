@@ -3,14 +3,21 @@
 
     scripts/tidy.py --jobs N FOLDER...
 
-A source that was found clean is not read again while nothing that is compiled with it changes, so that a run that was
-stopped goes on where it was. Exit status 1 when something was found.
+Nearly all of the time goes into the headers of Qt and of the standard library, which clang-tidy walks through for each file.
+So sources that are compiled with the same options are read several at a time, in a file that includes them. What is found
+in such a file is looked for again in each source that it names alone, and said as it is there.
+
+A source that was found clean is not read again while it, the headers of the project that it includes, its options, clang-tidy
+and the installed headers stay the same. So a run that was stopped goes on where it was. Exit status 1 when something was found.
 """
 import argparse
 import concurrent.futures
+import functools
 import hashlib
 import json
+import os
 import pathlib
+import re
 import shlex
 import subprocess
 import sys
@@ -18,6 +25,88 @@ import sys
 ROOT = pathlib.Path(__file__).resolve().parent.parent
 BUILD = ROOT / "build/tidy"
 CLEAN = BUILD / "clean"
+# Bytes of sources in a file that includes them. More costs memory, and reading more again when one of them is wrong.
+MOST = 60_000
+
+INCLUDE = re.compile(r'^[ \t]*#[ \t]*include[ \t]*(["<])([^">\n]+)[">]', re.MULTILINE)
+# What begins a line outside of classes and functions.
+TYPE = re.compile(r"^(?:class|struct|union|enum(?: class)?|using|#define) (\w+)(?!.*;)", re.MULTILINE)
+ALIAS = re.compile(r"^using (\w+) =", re.MULTILINE)
+FUNCTION = re.compile(r"^\w[^(={;\n]*?[ *&](\w+)\(", re.MULTILINE)
+VARIABLE = re.compile(r"^(?!using |namespace )\w[^(={;\n]*?[ *&](\w+)(?:\[[^\]\n]*\])*(?: = |\{|;| =$)", re.MULTILINE)
+FOUND = re.compile(r"^(/[^:\n]+):\d+:\d+: (?:warning|error): ", re.MULTILINE)
+
+
+@functools.lru_cache(maxsize=None)
+def text_of(path):
+    return pathlib.Path(path).read_text(errors="replace")
+
+
+@functools.lru_cache(maxsize=None)
+def hash_of(path):
+    return hashlib.sha256(text_of(path).encode()).hexdigest()
+
+
+@functools.lru_cache(maxsize=None)
+def included_by(path, folders):
+    """The files of the project that a file includes. @param folders  where they are looked for"""
+    found = []
+    for kind, name in INCLUDE.findall(text_of(path)):
+        for folder in ((os.path.dirname(path),) if kind == '"' else ()) + folders:
+            file = os.path.normpath(os.path.join(folder, name))
+            if file.startswith(f"{ROOT}/") and os.path.isfile(file):
+                found.append(file)
+                break
+    return found
+
+
+class Source:
+    """A file that is compiled, with its options."""
+
+    def __init__(self, entry):
+        self.path = entry["file"]
+        self.directory = entry["directory"]
+        arguments = shlex.split(entry["command"])
+        arguments = arguments[next(i for i, one in enumerate(arguments) if one.endswith("clang++")) + 1:]
+        del arguments[arguments.index("-o"):arguments.index("-o") + 2]
+        del arguments[arguments.index("-c"):arguments.index("-c") + 2]
+        self.options = tuple(arguments)
+        # Test files are compiled in files that include several of them already.
+        self.folders = tuple(one[2:] for one in arguments if one.startswith("-I")) + tuple(
+            after for one, after in zip(arguments, arguments[1:]) if one == "-isystem")
+        self.files = [self.path] + [file for file in included_by(self.path, self.folders) if file.endswith(".cpp")]
+        self.size = sum(len(text_of(file)) for file in self.files)
+
+    def key(self, tools):
+        """Changes with all that clang-tidy reads, comments too, as they can switch a check off."""
+        files = {self.path}
+        unread = [self.path]
+        while unread:
+            for file in included_by(unread.pop(), self.folders):
+                if file not in files:
+                    files.add(file)
+                    unread.append(file)
+        parts = [tools, self.directory, *self.options, *(f"{file} {hash_of(file)}" for file in sorted(files))]
+        return hashlib.sha256("\0".join(parts).encode()).hexdigest()
+
+    @functools.cached_property
+    def names(self):
+        """What it declares outside of classes, which another file in the same translation unit must not declare as well."""
+        text = text_of(self.path)
+        return {name for form in (TYPE, ALIAS, FUNCTION) for name in form.findall(text)} | self.variables
+
+    @functools.cached_property
+    def variables(self):
+        return set(VARIABLE.findall(text_of(self.path)))
+
+    @functools.cached_property
+    def words(self):
+        return set(re.findall(r"\w+", text_of(self.path)))
+
+    def fits(self, other):
+        """Whether both can be one translation unit. A local name may not hide a variable of the other file."""
+        return (self.names.isdisjoint(other.names) and self.variables.isdisjoint(other.words)
+                and other.variables.isdisjoint(self.words))
 
 
 def add_example(database):
@@ -33,8 +122,7 @@ def add_example(database):
 
 
 def of_folder(entries, folder):
-    """The entries of a folder's sources. Test files are read in the files that include several of them, as most of the
-    time goes into reading headers."""
+    """The sources of a folder. Test files are read in the files that include several of them."""
     found = {}
     for entry in entries:
         path = pathlib.Path(entry["file"])
@@ -42,32 +130,63 @@ def of_folder(entries, folder):
         generated = "cmake_pch" in name or "qrc_" in name or "verify_interface" in name
         if not generated and (name + "/").startswith(folder + "/"):
             found[entry["file"]] = entry
-    return [found[file] for file in sorted(found)]
+    return [Source(found[file]) for file in sorted(found)]
 
 
-def key_of(entry, tools):
-    """Stands for all that the compiler reads, comments too, as they can switch a check off."""
-    arguments = shlex.split(entry["command"])
-    arguments = arguments[next(i for i, one in enumerate(arguments) if one.endswith("clang++")):]
-    del arguments[arguments.index("-o"):arguments.index("-o") + 2]
-    made = subprocess.run([*arguments, "-E", "-CC"], cwd=entry["directory"], capture_output=True, check=False)
-    return None if made.returncode else hashlib.sha256(tools + made.stdout).hexdigest()
+def batches_of(sources):
+    """Sources that are read together."""
+    batches = []
+    for source in sources:
+        for batch in batches:
+            if (batch[0].options == source.options and sum(one.size for one in batch) + source.size <= MOST
+                    and all(source.fits(one) for one in batch)):
+                batch.append(source)
+                break
+        else:
+            batches.append([source])
+    return batches
 
 
-def check(entry, tools):
-    """@return what clang-tidy has found; empty when nothing"""
-    key = key_of(entry, tools)
-    if key and (CLEAN / key).exists():
-        return ""
-    run = subprocess.run(["clang-tidy", "-p", BUILD, "--quiet", "--warnings-as-errors=*", entry["file"]],
-                         capture_output=True, text=True, check=False)
+def read(sources):
+    """@return what clang-tidy says of sources that are read together; empty when it finds nothing"""
+    path = sources[0].path
+    if len(sources) > 1:
+        text = "".join(f'#include "{source.path}"\n' for source in sources)
+        folder = BUILD / "read"
+        folder.mkdir(exist_ok=True)
+        path = folder / (hashlib.sha256(text.encode()).hexdigest()[:16] + ".cpp")
+        path.write_text(text)
+    run = subprocess.run(["clang-tidy", "--quiet", "--warnings-as-errors=*", str(path), "--", *sources[0].options],
+                         cwd=sources[0].directory, capture_output=True, text=True, check=False)
+    if len(sources) > 1:
+        path.unlink()
     if run.returncode == 0:
-        if key:
-            (CLEAN / key).touch()
         return ""
     # On standard error it counts what it does not show.
     errors = [line for line in run.stderr.splitlines() if "error:" in line or "Error" in line]
-    return run.stdout + "\n".join(errors) or f"{entry['file']}: clang-tidy ended with {run.returncode}"
+    return run.stdout + "\n".join(errors) or f"{path}: clang-tidy ended with {run.returncode}"
+
+
+def check(sources, tools):
+    """@return what is found in sources that are read together; empty when nothing"""
+    said = read(sources)
+    if not said:
+        for source in sources:
+            (CLEAN / source.key(tools)).touch()
+        return ""
+    if len(sources) == 1:
+        return said
+    # Together they may not compile, or one may hide what another declares: what a source is charged with counts when it is
+    # found in it alone.
+    named = set(FOUND.findall(said))
+    alone = [source for source in sources if not named.isdisjoint(source.files)]
+    if not alone:
+        if named: # a header
+            return said
+        alone = sources
+    rest = [source for source in sources if source not in alone]
+    groups = [[source] for source in alone] + ([rest] if rest else [])
+    return "".join(check(group, tools) for group in groups)
 
 
 def main():
@@ -76,19 +195,26 @@ def main():
     parser.add_argument("folders", nargs="+")
     options = parser.parse_args()
     CLEAN.mkdir(parents=True, exist_ok=True)
-    tools = subprocess.run(["clang-tidy", "--version"], capture_output=True, check=True).stdout
-    tools += (ROOT / ".clang-tidy").read_bytes()
+    tools = "".join(subprocess.run(command, capture_output=True, text=True, check=True).stdout
+                    for command in (["clang-tidy", "--version"], ["dpkg-query", "-W", "*-dev"]))
+    tools += (ROOT / ".clang-tidy").read_text()
     entries = add_example(BUILD / "compile_commands.json")
+    batches = []
+    for folder in options.folders:
+        sources = of_folder(entries, folder)
+        unread = [source for source in sources if not (CLEAN / source.key(tools)).exists()]
+        print(f"clang-tidy: {folder} ({len(sources)} files, {len(unread)} to read)" if sources else
+              f"clang-tidy: {folder}: nothing of it is built", flush=True)
+        batches += batches_of(unread)
     status = 0
     with concurrent.futures.ThreadPoolExecutor(options.jobs) as pool:
-        for folder in options.folders:
-            chosen = of_folder(entries, folder)
-            print(f"clang-tidy: {folder} ({len(chosen)} files)" if chosen else f"clang-tidy: {folder}: nothing of it is built",
-                  flush=True)
-            for found in pool.map(lambda entry: check(entry, tools), chosen):
-                if found:
-                    print(found, flush=True)
-                    status = 1
+        waiting = {pool.submit(check, batch, tools): batch for batch in batches}
+        for number, done in enumerate(concurrent.futures.as_completed(waiting), 1):
+            first = os.path.relpath(waiting[done][0].path, ROOT)
+            print(f"clang-tidy: {number} of {len(batches)}: {first} and {len(waiting[done]) - 1} more", flush=True)
+            if done.result():
+                print(done.result(), flush=True)
+                status = 1
     return status
 
 
