@@ -23,7 +23,7 @@ if(NOT KAREPORT_SANITIZE)
                            $<$<CONFIG:Release,RelWithDebInfo,MinSizeRel>:-U_FORTIFY_SOURCE;-D_FORTIFY_SOURCE=2>)
 endif()
 if(KA_SYSTEM STREQUAL Windows AND CMAKE_CXX_COMPILER_ID STREQUAL GNU)
-    target_link_libraries(ka_hardening INTERFACE ssp) # what the checks call is no part of the C library there
+    target_link_libraries(ka_hardening INTERFACE ssp) # what the checks call is not part of the C library there
 endif()
 # All addresses are bound at the start, and the tables of them are read-only from then on.
 target_link_options(ka_hardening INTERFACE $<$<PLATFORM_ID:Linux>:LINKER:-z,relro;LINKER:-z,now>)

@@ -264,7 +264,7 @@ def write_stakeout(road, profile):
 
 # ------------------------------------------------------------------------------------------------------- the layers
 
-# Name, code, thickness in hundredths of a metre, whether it stands in every row or is that of the layer as a whole.
+# Name, code, thickness in hundredths of a metre, whether it is in every row or is that of the layer as a whole.
 LAYERS = [("Surface course", "SC", 4, True), ("Binder course", "BC", 8, True), ("Base course", "BAS", 14, True),
           ("Subbase", "SB", 25, False), ("Capping layer", "CL", 30, False)]
 

@@ -41,7 +41,7 @@ void CsvResult::addRow(const ResultRow &row)
         }
     }
     if (out().size() == start) {
-        out() += "\"\""; // a line of nothing would be no row to many readers
+        out() += "\"\""; // many readers skip an empty line
     }
     out() += '\n';
     flush();

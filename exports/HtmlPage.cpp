@@ -46,8 +46,8 @@ th[aria-sort] span::after{content:""}
 }
 )";
 
-// Rows are sorted in each group by themselves. A number is that of the cell, or of its text. The labels are no button
-// elements: Chromium does not repeat a heading that has one on each sheet of paper.
+// Rows are sorted in each group by themselves. A number is that of the cell, or of its text. The labels are not
+// button elements: Chromium does not repeat a heading that has one on each sheet of paper.
 constexpr std::string_view script = R"(
 for (const table of document.querySelectorAll('table.data')) {
   const heads = [...table.tHead.rows[0].cells];

@@ -20,7 +20,7 @@ namespace
 constexpr char dataRows = 'd';
 constexpr char totals = 't';
 
-/// The characters of a number from its decimal sign on, or from the letters on that stand after it.
+/// The characters of a number from its decimal sign on, or from the letters after it on.
 qsizetype tailOf(QStringView text)
 {
     const qsizetype point = text.indexOf(u'.');
@@ -74,7 +74,7 @@ bool HtmlResult::beginTable(const ResultTable &table)
     return true;
 }
 
-/// Writes the heading of the table, which waits for what stands under it: no page ends with it.
+/// Writes the heading of the table, which waits for what comes under it: no page ends with it.
 void HtmlResult::openTable()
 {
     if (!isHeadPending_) {

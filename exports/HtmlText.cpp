@@ -8,7 +8,7 @@ namespace kareport
 namespace
 {
 
-/// What stands for a character in a page; null where it is itself.
+/// How a character is written in a page; null where it is written as itself.
 const char *entityOf(char16_t character)
 {
     switch (character) {

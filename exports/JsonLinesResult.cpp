@@ -41,7 +41,7 @@ void JsonLinesResult::addRow(const ResultRow &row)
     flush();
 }
 
-/// A text of the data; an empty one is no value.
+/// A text of the data; an empty one is a missing value.
 void JsonLinesResult::appendText(QStringView text)
 {
     if (text.isEmpty()) {

@@ -11,7 +11,7 @@ namespace kareport
 class SheetNames
 {
 public:
-    /// A name for the next sheet: the wanted one, with what cannot stand in it replaced by "_", cut where it is too long, and
+    /// A name for the next sheet: the wanted one, with what cannot be in it replaced by "_", cut where it is too long, and
     /// numbered where it is taken already.
     QString add(const QString &wanted);
 

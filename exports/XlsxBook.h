@@ -93,7 +93,7 @@ private:
     quint64 cutTexts_ = 0;
 };
 
-/// A text as the cells of a workbook hold it: "_x0041_" would be read as "A", and some characters stand in no file.
+/// A text as the cells of a workbook hold it: "_x0041_" would be read as "A", and some characters cannot be in any file.
 /// @param most  characters that there may be, with all escapes @return how many characters of the text are in it
 qsizetype appendSheetText(std::string &out, QStringView text, qsizetype most);
 

@@ -58,7 +58,7 @@ XlsxResult::Column XlsxResult::bearingValueOf(const Column &bearing) const
     value.column.field.Label = bearing.column.field.Label.trimmed() + QStringLiteral(" (°)");
     value.width = width;
     value.format = book_->formatOf(value.look);
-    value.totalFormat = value.format; // nobody adds directions
+    value.totalFormat = value.format; // directions are not added up
     return value;
 }
 

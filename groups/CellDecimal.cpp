@@ -30,14 +30,14 @@ CellDecimal parse(std::string_view text)
     const std::size_t sign = text[mark + 1] == '+' ? 2 : 1; // a plus is not read
     std::from_chars(text.data() + mark + sign, text.data() + text.size(), exponent);
     int decimals = 0;
-    bool isBehindPoint = false;
+    bool isAfterPoint = false;
     for (const char character : mantissa) {
         if (character == '.') {
-            isBehindPoint = true;
+            isAfterPoint = true;
             continue;
         }
         number.digits = number.digits * 10 + (character - '0');
-        decimals += isBehindPoint ? 1 : 0;
+        decimals += isAfterPoint ? 1 : 0;
     }
     number.exponent = exponent - decimals;
     while (number.digits != 0 && number.digits % 10 == 0) {
@@ -48,7 +48,7 @@ CellDecimal parse(std::string_view text)
     return number.digits == 0 ? CellDecimal() : number;
 }
 
-/// The fewest digits that stand for a double.
+/// The fewest digits that read as a double.
 CellDecimal shortest(double value)
 {
     std::array<char, 40> text;

@@ -18,8 +18,8 @@ struct CellDecimal
 /// Says which decimal number a cell had that was read into a double and converted into an internal unit.
 ///
 /// A number of up to 15 significant digits comes back as it was written. Of a longer one, the double that it was read into
-/// counts as the shortest decimal that stands for it. Degrees are counted in seconds: a third of a degree is no decimal number,
-/// but 1200 seconds are.
+/// counts as the shortest decimal that reads as it. Degrees are counted in seconds: a third of a degree is not a
+/// decimal number, but 1200 seconds are.
 class CellReader
 {
 public:

@@ -20,7 +20,7 @@ struct ColumnTotal
         sum.add(number);
         addRange(value, value, 1);
     }
-    /// Counts a value that is no number.
+    /// Counts a value that is not a number.
     void addText() { ++count; }
     /// Adds what was added up of other rows.
     void add(const ColumnTotal &other);

@@ -23,11 +23,11 @@ std::string withPoint(std::string digits, int decimals)
     if (decimals <= 0) {
         return digits;
     }
-    const auto behind = static_cast<std::size_t>(decimals);
-    if (digits.size() <= behind) {
-        digits.insert(0, behind + 1 - digits.size(), '0');
+    const auto fraction = static_cast<std::size_t>(decimals);
+    if (digits.size() <= fraction) {
+        digits.insert(0, fraction + 1 - digits.size(), '0');
     }
-    return digits.insert(digits.size() - behind, 1, '.');
+    return digits.insert(digits.size() - fraction, 1, '.');
 }
 
 } // namespace

@@ -33,7 +33,7 @@ class ExactDecimal
 public:
     ExactDecimal() = default;
     /// @param digits    the number without its decimal point
-    /// @param decimals  how many of the digits are behind the point, from 0
+    /// @param decimals  how many of the digits are after the point, from 0
     ExactDecimal(bool isNegative, Natural digits, int decimals)
         : isNegative_(isNegative), digits_(std::move(digits)), decimals_(decimals)
     {}

@@ -150,11 +150,11 @@ QString TotalFormatter::longText(const RoundedDecimal &number, QStringView suffi
     }
     const auto format = options_.settings->stationFormat;
     if (field_.Type == VARIABLE_STATION && format != UJobSettings::StationFormat::Plain) {
-        const qsizetype behindPlus = format == UJobSettings::StationFormat::HundredsPlus ? 2 : 3;
+        const qsizetype digitsAfterPlus = format == UJobSettings::StationFormat::HundredsPlus ? 2 : 3;
         const qsizetype point = text.indexOf(u'.');
         const qsizetype whole = point < 0 ? text.size() : point;
-        text.insert(0, QString(std::max<qsizetype>(behindPlus + 1 - whole, 0), u'0'));
-        text.insert(std::max(whole - behindPlus, qsizetype(1)), u'+');
+        text.insert(0, QString(std::max<qsizetype>(digitsAfterPlus + 1 - whole, 0), u'0'));
+        text.insert(std::max(whole - digitsAfterPlus, qsizetype(1)), u'+');
     }
     return sign + text;
 }

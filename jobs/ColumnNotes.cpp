@@ -13,7 +13,7 @@ namespace kareport
 namespace
 {
 
-/// More columns than this are not worth a note each: the file is then read with the wrong delimiter, or is no table.
+/// More columns than this are not worth a note each: the file is then read with the wrong delimiter, or is not a table.
 constexpr std::size_t mostColumnNotes = 100;
 /// How many names a misspelt one is compared with.
 constexpr qsizetype mostNames = 1000;
@@ -62,7 +62,7 @@ bool ColumnComparison::isRead(const QString &variable) const
     return read_.contains(foldedKey(variable));
 }
 
-/// Whether a column is no variable. One whose variable is read from another column, as the job says, is one all the same.
+/// Whether a column is not a variable. One whose variable is read from another column, as the job says, is a variable all the same.
 bool ColumnComparison::isUnknown(const SourceColumn &column) const
 {
     return !column.isKnown && !column.isOffered && !column.name.isEmpty() &&
@@ -93,7 +93,7 @@ QString ColumnComparison::variableQuestion(const QString &name) const
     return questions_.ask(dictionary_.DictionaryName, name, [this] { return variableNames(dictionary_); });
 }
 
-/// Asks which column was meant of those that are no variables.
+/// Asks which column was meant of those that are not variables.
 QString ColumnComparison::columnQuestion(const QString &name) const
 {
     return questions_.ask(dictionary_.DictionaryName + QChar() + data_, name, [this] {

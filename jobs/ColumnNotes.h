@@ -54,7 +54,7 @@ public:
     /// Whether a variable is read from a column.
     bool isRead(const QString &variable) const;
 
-    /// Notes on the columns that are no variable of the dictionary. Of very many, the last note says how many more there are.
+    /// Notes on the columns that are not variables of the dictionary. Of very many, the last note says how many more there are.
     std::vector<JobNote> unknownColumns() const;
 
     /// The keys of the units that numbers of the data are taken to be in, as the job does not say them.

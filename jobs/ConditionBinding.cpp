@@ -16,7 +16,7 @@ void bindLimit(RowCondition &bound, const TableShape::Condition &condition, cons
                VariableLookup &lookup)
 {
     if (!isNumeric(of.type)) {
-        lookup.fail(condition.of.path, Xlate("values of the variable \"%1\" are no numbers").arg(of.name));
+        lookup.fail(condition.of.path, Xlate("the values of the variable \"%1\" are not numbers").arg(of.name));
         return;
     }
     const auto limit = lookup.valueOf(of, condition.values.front());
@@ -25,7 +25,7 @@ void bindLimit(RowCondition &bound, const TableShape::Condition &condition, cons
     }
     bound.limit = numberOf(&*limit).value_or(0);
     if (bound.kind == RowCondition::Kind::Outside && !(bound.limit >= 0)) {
-        lookup.fail(condition.values.front().path, Xlate("a tolerance from 0 on was expected"));
+        lookup.fail(condition.values.front().path, Xlate("a tolerance of 0 or more was expected"));
     } else if (std::isnan(bound.limit)) {
         lookup.fail(condition.values.front().path, Xlate("a number was expected: nothing is above or below NAN"));
     }

@@ -9,7 +9,7 @@ namespace kareport
 namespace
 {
 
-/// The same for all names of a file. What is no file has its name alone.
+/// The same for all names of a file. What is not a file is known by the name that it is given.
 QString keyOf(const QString &path)
 {
     const QString identity = path == u"-" ? QString() : fileIdentity(path);

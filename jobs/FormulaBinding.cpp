@@ -63,7 +63,7 @@ std::optional<RowFormula> bindFormula(const TableShape::Formula &formula, const 
         if (equalFolded(name.text, formula.variable.text)) {
             lookup.fail(name.path, Xlate("a variable cannot be computed of itself"));
         } else if (!lookup.error() && !isNumeric(operands.back().type)) {
-            lookup.fail(name.path, Xlate("values of the variable \"%1\" are no numbers").arg(name.text));
+            lookup.fail(name.path, Xlate("the values of the variable \"%1\" are not numbers").arg(name.text));
         }
         lookup.expectSet(name, operands.back());
     }

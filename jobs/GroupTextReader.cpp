@@ -50,7 +50,7 @@ QStringList expectedNames(const std::vector<FoundVariable> &by)
     return names;
 }
 
-/// The piece that a placeholder stands for; nothing for one that is not known.
+/// The piece that a placeholder is replaced by; nothing for one that is not known.
 std::optional<Piece> placeholderOf(const QString &name, const JsonPath &path, const std::vector<FoundVariable> &by,
                                    const TotalIndex &indexOf, VariableLookup &lookup)
 {

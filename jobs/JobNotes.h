@@ -19,7 +19,7 @@ struct JobNote
 {
     enum class Kind
     {
-        UnknownColumn, ///< a column that is no variable, so that it is not read
+        UnknownColumn, ///< a column that is not a variable, so that it is not read
         UnfilledField, ///< a field whose variable is in no column or no dictionary, so that it shows nothing or zero
         WideValue,     ///< values wider than their column
         MissingValue,  ///< values that are not there and show as 0
@@ -38,7 +38,7 @@ struct JobNote
     quint64 values = 0;    ///< how many values are meant; 0 for none
     quint64 firstRow = 0;  ///< of the data as it is printed, from 1; 0 for none
     QString dataFile = {}; ///< what the value of that row was read from; empty where it is not known
-    std::optional<TextPlace> dataPlace = std::nullopt; ///< where it stands there; nothing for a database
+    std::optional<TextPlace> dataPlace = std::nullopt; ///< where it is there; nothing for a database
 
     /// Whether the user has to look at it.
     bool isToBeSaid() const { return kind != Kind::AssumedUnit && kind != Kind::BlankValue; }

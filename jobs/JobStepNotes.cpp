@@ -41,7 +41,7 @@ JobSteps::Wrong JobSteps::noteColumns(const SourceColumns &columns, const QStrin
     return wrong;
 }
 
-/// Notes the units that nobody says, once for a data set.
+/// Notes the units that were assumed, once for a data set.
 void JobSteps::noteUnits(const ColumnComparison &compared, const QString &data)
 {
     const Job::DataSet &set = *job_.data.constFind(data);

@@ -46,7 +46,7 @@ public:
         : job_(job), source_(source), data_(data), report_(report), notes_(notes), isStopped_(isStopped)
     {}
 
-    /// Says what the placeholders of lines and headings stand for; null where they have none. They must outlive the steps.
+    /// Says what the placeholders of lines and headings are replaced by; null where they have none. They must outlive the steps.
     void setPlaceholders(const Placeholders *placeholders) { placeholders_ = placeholders; }
     /// Says which outputs receive the values that are written; null for none. They must outlive the steps.
     void setResults(ResultOutputs *results) { results_ = results; }

@@ -133,7 +133,7 @@ void JsonObjectList::noteMember(const JsonSource &source, const JsonNode &member
 
 std::optional<SourceColumns> JsonObjectList::columns() const
 {
-    // Without a row nobody knows what keys there would be.
+    // Without a row the keys are not known.
     return hasRow_ ? std::optional(columns_) : std::nullopt;
 }
 

@@ -19,7 +19,7 @@ struct NamedReport
 QString fileNameOf(const QString &text);
 
 /// The full name that a save dialog proposes for a report: its own name where it has a file, its title where it has none,
-/// beside its own file, or beside what it was made of, unless nobody can write there.
+/// beside its own file, or beside what it was made of, unless that cannot be written to.
 /// @param ending  such as "pdf"
 QString proposedName(const NamedReport &report, const QString &ending);
 

@@ -31,7 +31,7 @@ Expected<JsonSource> sourceOf(const ReportRecipe &recipe)
                     : Expected<JsonSource>(JsonSource::fromObject(std::get<TemplateJob>(recipe.origin).toJson()));
     if (auto *source = std::get_if<JsonSource>(&read)) {
         for (auto setting = recipe.settings.begin(); setting != recipe.settings.end(); ++setting) {
-            // A job whose settings are no object has no place for one, which reading it says.
+            // A job whose settings are not an object has no place for one, which reading it says.
             source->set(QStringLiteral("settings.") + setting.key(), jsonOf(setting.value()));
         }
     }

@@ -37,7 +37,7 @@ public:
     void addSet(const QString &variable, int stage);
     /// Says which stage asks for variables next.
     void goTo(int stage) { stage_ = stage; }
-    /// Fails where the step sets a variable in this stage or later only: nobody can ask for it yet.
+    /// Fails where the step sets a variable in this stage or later only: it has no value yet.
     void expectSet(const TableShape::Name &name, const FoundVariable &variable);
     /// Whether the step sets a variable.
     bool isSet(quint32 id) const { return setAt(id) != nullptr; }

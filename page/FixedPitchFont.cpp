@@ -3,7 +3,7 @@
 namespace kareport
 {
 
-const QStringList &standInFaces()
+const QStringList &substituteFaces()
 {
     static const QStringList faces = {QStringLiteral("DejaVu Sans Mono"), QStringLiteral("Liberation Mono"),
                                       QStringLiteral("Hack")};
@@ -22,7 +22,7 @@ QFont fixedPitchFont(const QString &face)
 void setFixedPitch(QFont &font)
 {
     QStringList families = font.families();
-    for (const QString &face : standInFaces()) {
+    for (const QString &face : substituteFaces()) {
         if (!families.contains(face)) {
             families.append(face);
         }

@@ -10,16 +10,16 @@ namespace kareport
 /// The most characters that the name of a face has on a printer.
 inline constexpr qsizetype longestFaceName = 31;
 
-/// The faces that stand in for a fixed-pitch face that is not installed, the nearest first. The system would take a
-/// proportional one. Where a page is measured, shown, printed and saved as a PDF the same one has to stand in, or lines and
+/// The faces that replace a fixed-pitch face that is not installed, the nearest first. The system would take a
+/// proportional one. Where a page is measured, shown, printed and saved as a PDF the same one has to replace it, or lines and
 /// pages would not agree.
-const QStringList &standInFaces();
+const QStringList &substituteFaces();
 
 /// A font of a fixed pitch, upright and of normal weight whatever the application's own font is.
-/// @param face  the face that is wanted; `standInFaces` follow it
+/// @param face  the face that is wanted; `substituteFaces` follow it
 QFont fixedPitchFont(const QString &face);
 
-/// Has the system take a fixed-pitch face, and `standInFaces` after those that a font names.
+/// Has the system take a fixed-pitch face, and `substituteFaces` after those that a font names.
 void setFixedPitch(QFont &font);
 
 } // namespace kareport

@@ -125,7 +125,7 @@ public:
         if (error_) {
             return error_;
         }
-        // Rows that were not asked for may be wrong, but nobody has seen that.
+        // Rows that were not asked for may be wrong, but they have not been checked.
         return isAtEnd_ || kept_->rows.empty() ? kept_->list->error() : std::nullopt;
     }
     std::optional<SourceColumns> columns() const override { return kept_->list->columns(); }

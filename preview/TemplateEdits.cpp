@@ -335,10 +335,10 @@ QString wrongName(const OutlineTemplate &one, const VariableUse &use, const QStr
         return Xlate("A name without < and > was expected.");
     }
     if (fieldMarker(name) != FieldMarker::None) {
-        return Xlate("\"%1\" is no variable: it has a meaning of its own.").arg(name);
+        return Xlate("\"%1\" cannot be the name of a variable: it has a meaning of its own.").arg(name);
     }
     const bool isTaken = !equalFolded(name, use.name) && !usesOf(one, {use.dictionary, name}).empty();
-    return isTaken ? Xlate("There is a variable \"%1\" already.").arg(name) : QString();
+    return isTaken ? Xlate("There is already a variable \"%1\".").arg(name) : QString();
 }
 
 } // namespace
@@ -410,7 +410,7 @@ EditedTemplate withOutput(const QString &text, qsizetype position, bool isTable)
     const TemplateOutline outline = outlineOf(made);
     const OutlineTemplate &one = *outline.templateAt(at);
     if (one.dictionaryList.empty()) {
-        return refused(text, Xlate("The template cannot be read: mend what the list of remarks says first."));
+        return refused(text, Xlate("The template cannot be read: correct what the list of remarks says first."));
     }
     QStringList names;
     for (const OutlineOutput &output : one.outputs) {

@@ -79,7 +79,7 @@ struct OutlineTemplate
     const OutlineOutput *output(bool isTable, QStringView name) const;
 };
 
-/// What stands where in the text of a template file, as the file is read. What is not read is not in it.
+/// What is where in the text of a template file, as the file is read. What is not read is not in it.
 struct TemplateOutline
 {
     std::vector<OutlineTemplate> templates;

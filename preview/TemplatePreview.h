@@ -23,7 +23,7 @@
 namespace kareport
 {
 
-/// A report that pages are made in and nobody opens. It is made and deleted by the thread of the windows, as all reports are;
+/// A report that pages are made in, without a view. It is made and deleted by the thread of the windows, as all reports are;
 /// the pages may be made in it by another one.
 class PreviewReport : public UReportDoc
 {

@@ -188,7 +188,7 @@ void DataWriter::writeTable(const UXmlReportTable &table, UDataObjectList &list,
 
 /// At a page's start the header brings the heading with it. Without headers the heading is then not written at all,
 /// which hosts that lay out their own pages count on.
-/// @param lines  that stay with the heading, where a page can hold as many; 0 where nobody has counted
+/// @param lines  that stay with the heading, where a page can hold as many; 0 where they were not counted
 void DataWriter::placeHeading(const UXmlReportTable &table, bool writeName, qint64 lines)
 {
     if (page_.heading().text.isEmpty()) {
@@ -316,7 +316,7 @@ void DataWriter::formatRow(const std::vector<FieldFormatter> &fields, const UDat
                                     : field.append(row_, options_, ValueKind::None, nullptr, suffix, widest);
             if (entry != nullptr && field.shows(entry->kind())) {
                 addShown(remarks, about, shown, row);
-            } else { // a text that another variable of the same identifier has is no number
+            } else { // a text that another variable of the same identifier has is not a number
                 about.wideZeros += shown == Shown::TooWide ? 1U : 0U;
                 addMissing(remarks, about, field, options_, row);
             }
@@ -341,7 +341,7 @@ void DataWriter::formatRow(const std::vector<FieldFormatter> &fields, const UDat
 /// Notes where the cells of a line are. @param start  of the line in the text
 void DataWriter::addCells(const std::vector<WrittenCell> &line, qint64 start)
 {
-    for (WrittenCell cell : line) { // none where nobody wants them
+    for (WrittenCell cell : line) { // none where they are not needed
         cell.at += start;
         cells_->add(cell);
     }

@@ -61,7 +61,7 @@ private:
     const FormatOptions &options_;
     TextBuffer row_;
     ResultFeed feed_;
-    WrittenCells *cells_;               ///< null where nobody wants them
+    WrittenCells *cells_;               ///< null where they are not needed
     int record_ = 0;                    ///< of the cells
     std::vector<WrittenCell> rowCells_; ///< of the row that was formatted last, by their places in it
     std::deque<std::pair<quint64, std::vector<WrittenCell>>> waitingCells_; ///< of rows, from 1, without a place

@@ -100,7 +100,7 @@ private:
     std::vector<TotalFormatter> texts_;                  ///< by the variables, for texts
     std::vector<TotalledCell> cells_;
     KeptLines lines_;
-    GroupResults *results_ = nullptr; ///< null where nobody wants them
+    GroupResults *results_ = nullptr; ///< null where they are not needed
 
     std::vector<OpenGroup> open_; ///< by the levels
     std::vector<Totals> totals_;  ///< of the table, and of the levels after it

@@ -205,7 +205,7 @@ std::vector<ResultTotal> GroupedTable::resultsOf(const TotalLine &line, const To
     return results;
 }
 
-/// Hands lines of totals on. A label stands in the first column where that shows texts, else on a line of its own.
+/// Hands lines of totals on. A label is in the first column where that shows texts, else on a line of its own.
 void GroupedTable::giveTotals(const TotalsOf &of, const std::vector<TotalLine> &lines, const Totals &totals,
                               quint64 rows, const UDataObject *object)
 {

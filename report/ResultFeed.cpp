@@ -104,7 +104,7 @@ void ResultFeed::take(const FieldFormatter &field, const UDictEntry *entry, QStr
     } else {
         texts_.append(shown.trimmed());
     }
-    // A text that another variable of the same identifier has is no number.
+    // A text that another variable of the same identifier has is not a number.
     row_.cells[ends_.size()].value = entry != nullptr && field.shows(entry->kind()) ? entry : nullptr;
     ends_.push_back(texts_.size());
 }

@@ -31,7 +31,7 @@ struct ResultTotal
 class ResultFeed
 {
 public:
-    /// @param sink  null where nobody wants results: then nothing is done
+    /// @param sink  null where results are not needed: then nothing is done
     ResultFeed(ResultSink *sink, const FormatOptions &options) : sink_(sink), options_(options) {}
 
     /// @param addsPrinted  as `ResultTable` has it

@@ -41,7 +41,7 @@ struct ResultTable
 /// What a total says of the values above it.
 enum class ResultTotalKind
 {
-    None, ///< it is no total
+    None, ///< not a total
     Sum,
     Mean,
     Least,
@@ -64,7 +64,7 @@ enum class ResultRowKind
 {
     Row,         ///< an object of the data
     GroupFooter, ///< values that a group ends with
-    Total        ///< totals of the table; those of pages are no results, which have no pages
+    Total        ///< totals of the table; those of pages are left out, as results have no pages
 };
 
 struct ResultRow

@@ -10,7 +10,7 @@ enum class Measure
     Length,
     Area,
     Angle,
-    Thickness, ///< some of its numbers are no numbers
+    Thickness, ///< some of its numbers are codes, such as "the layer's own"
     Truth,
     Text
 };

@@ -4,7 +4,7 @@
     scripts/update-translations.py           adds new texts, takes out those that are gone, keeps translations
     scripts/update-translations.py --check   says what is missing or out of date; exit status 1 when something is
 
-Texts stand in Xlate("...") or QT_TRANSLATE_NOOP("KaReport", "..."). What follows "@@" in a text is a note for the
+Texts are in Xlate("...") or QT_TRANSLATE_NOOP("KaReport", "..."). What follows "@@" in a text is a note for the
 translator. The files are Qt's (.ts): they open in Qt Linguist.
 """
 import pathlib

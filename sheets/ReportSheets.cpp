@@ -189,7 +189,7 @@ void ReportSheets::showCursor(bool follows)
         return;
     }
     const QTextCursor cursor = edit_.textCursor();
-    // While a text is loaded its cursor is put back where it was: that is no reason to go there.
+    // While a text is loaded its cursor is put back where it was: that is not a reason to go there.
     pane_->view().setCursorPlace(cursor.anchor(), cursor.position(), follows && (isCurrent() || !hasShown_));
     pane_->thumbnails().setCurrent(pane_->view().current());
     if (follows) {

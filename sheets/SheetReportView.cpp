@@ -69,7 +69,7 @@ SheetPaper SheetReportView::paper() const
     if (report == nullptr) {
         return {};
     }
-    // What a print command begins with: the page measured anew, on the printer that it prints on.
+    // What a print command begins with: the page measured again, on the printer that it prints on.
     const PageGeometry page = ReportAccess::printedPage(*report);
     const auto device = reportPageDevice();
     SheetPaper paper;

@@ -43,7 +43,7 @@ private:
     void choose(int sheet);
 
     QCache<int, QPixmap> pictures_;
-    QTimer forgetTimer_; ///< the pictures are drawn anew when the text has rested
+    QTimer forgetTimer_; ///< the pictures are drawn again when the text has not changed for a while
     int shown_ = -1;
     std::function<void(int)> go_;
 };

@@ -37,7 +37,7 @@ struct SourceColumn
     QString name;                   ///< empty where columns have none
     std::optional<TextPlace> place; ///< of the name in the file
     bool isKnown = false;           ///< some variable is read from it
-    bool isOffered = false;         ///< it is no column of values of the data itself, so that it need not be read
+    bool isOffered = false;         ///< it is not a column of values of the data itself, so that it need not be read
 };
 
 /// A variable that is read from a column.
@@ -64,7 +64,7 @@ public:
     /// Finds the variable of each column. A column that a choice names is read for the variable that chose it; any other
     /// for the variable of its name, unless that has chosen another column. What is left is skipped.
     /// @param columns  known ones are marked
-    /// @return what is wrong: a choice that is no variable or no column, two columns of one variable
+    /// @return what is wrong: a choice of a variable or a column that does not exist, two columns of one variable
     std::optional<ColumnFault> bind(std::vector<SourceColumn> &columns, const std::vector<ColumnChoice> &choices,
                                     const Variables &variables);
 

@@ -43,7 +43,7 @@ Expected<std::shared_ptr<const FileBytes>> FileBytes::openStandardInput()
     return ofHandle(QStringLiteral("-"), kareport::openStandardInput());
 }
 
-/// The bytes of what was opened, which is closed after it; a handle below 0 stands for what could not be opened.
+/// The bytes of what was opened, which is closed after it; the handle is below 0 where it could not be opened.
 Expected<std::shared_ptr<const FileBytes>> FileBytes::ofHandle(const QString &path, int handle)
 {
     auto bytes = std::make_shared<FileBytes>();

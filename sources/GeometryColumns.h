@@ -60,7 +60,7 @@ std::optional<ColumnFault> bindDatabaseColumns(ColumnBinding &binding, std::vect
 bool needsGeometry(const std::vector<FieldSource> &sources);
 bool needsReferenceSystem(const std::vector<FieldSource> &sources);
 
-/// Stores a part of a point; what the point does not have is no value.
+/// Stores a part of a point; what the point does not have is a missing value.
 /// @param point   nothing where there is no geometry
 /// @param system  null where it is not known
 /// @return what is wrong; nothing when it is stored

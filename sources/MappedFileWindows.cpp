@@ -82,7 +82,7 @@ void MappedFile::release(std::size_t begin, std::size_t end) const
 
 bool MappedFile::isLost() const
 {
-    return false; // the system lets nobody cut a file short that is mapped
+    return false; // the system does not let a mapped file be cut short
 }
 
 } // namespace kareport

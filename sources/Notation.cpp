@@ -56,7 +56,7 @@ enum class Between
 };
 
 /// Reads degrees, minutes and seconds without a sign; what is smaller may be missing, and the mark of the last part.
-/// @return how many marks there are; -1 when the text is no such angle
+/// @return how many marks there are; -1 when the text is not such an angle
 int parseParts(std::string_view text, Between between, double &degrees)
 {
     degrees = 0;

@@ -29,7 +29,7 @@ struct NotedAngle
     Unit unit;
 };
 
-/// An angle with marks: 45°30'15.5", 45.504°, 50.56g. The letter d stands for a degree mark, º too; ′ and ″ for those of
+/// An angle with marks: 45°30'15.5", 45.504°, 50.56g. The letter d is a degree mark, and so is º; ′ and ″ for those of
 /// minutes and seconds. A number without a mark is none.
 std::optional<NotedAngle> parseMarkedAngle(std::string_view text);
 

@@ -34,7 +34,7 @@ qint64 powerOfTen(std::string_view text)
     return (isNegative ? -exponent : exponent) + (first < point ? point - first - 1 : point - first);
 }
 
-/// A number too small for a double is 0; one too large is no number. Not every system has a wider type to ask.
+/// A number too small for a double is 0; one too large is refused. Not every system has a wider type to ask.
 bool parseOutOfRange(std::string_view text, double &number)
 {
     number = text.starts_with('-') ? -0.0 : 0.0;
@@ -63,7 +63,7 @@ bool takeDigits(std::string_view text, const NumberStyle &style, bool isFraction
         result += group.substr(0, digits);
         at += mark.size() + digits;
     }
-    // 0.123 is no number in thousands, but one with another decimal sign.
+    // 0.123 is not a number in thousands, but one with another decimal sign.
     const bool isEnded = at == text.size() || text[at] != style.decimal;
     return groups != 1 || text[start] != '0' || !isEnded || (mark != "." && mark != ",");
 }

@@ -23,8 +23,8 @@ bool parseWhole(std::string_view text, qint32 &number);
 /// true, yes, y, t, 1, * and false, no, n, f, 0, in any case; blanks around it are allowed.
 bool parseBoolean(std::string_view text, bool &value);
 
-/// Writes a text with numbers of a style as it is with a decimal point and no thousands. A decimal point that is none of the
-/// style, and thousands that are no groups of three digits, are no such text.
+/// Writes a text with numbers of a style as it is with a decimal point and no thousands. A decimal point that the style does
+/// not have, and thousands that are not groups of three digits, are refused.
 /// @param result  is replaced
 bool toPlainNumbers(std::string_view text, const NumberStyle &style, std::string &result);
 

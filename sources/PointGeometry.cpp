@@ -131,7 +131,7 @@ PointOrFault parseHexPoint(std::string_view text)
     if (text.starts_with("\\x")) {
         text.remove_prefix(2);
     }
-    // A longer text is no point; its first bytes say its kind.
+    // A longer text is not a point; its first bytes say its kind.
     constexpr std::size_t longestPoint = 2 * (1 + 4 + 4 + 4 * 8);
     const bool isWhole = text.size() <= longestPoint;
     std::string bytes;

@@ -80,7 +80,7 @@ protected:
     /// Stores the value of a field, and notes once where it takes the place of another one of the row under the same identifier.
     /// @param isShared  another field has the identifier as well
     /// @param store     stores it. @return whether it fits
-    /// @param place     says where the value stands; nothing where that has no place
+    /// @param place     says where the value is; nothing where that has no place
     template <typename Store, typename Place>
     bool storeOver(bool isShared, unsigned id, const QString &column, UDataObject &object, const Store &store,
                    const Place &place)

@@ -252,7 +252,7 @@ void FieldFormatter::appendOffset(TextBuffer &out, const UJobSettings &settings,
     out.append(value < 0 ? u'L' : u'R');
 }
 
-/// A thickness is held in hundredths. Those with bit 15 set stand for "the layer's own", the small negative ones among
+/// A thickness is held in hundredths. Those with bit 15 set mean "the layer's own", the small negative ones among
 /// them.
 void FieldFormatter::appendThickness(TextBuffer &out, double value) const
 {

@@ -103,7 +103,7 @@ in_folder '' 0
 in_folder 'the element "."' 2
 
 if scripts/check-binaries.sh "$folder/main.cpp" > "$folder/said" || ! grep -q 'cannot be read' "$folder/said"; then
-    echo 'what is no program was taken for one'
+    echo 'what is not a program was taken for one'
     failed=1
 fi
 exit $failed

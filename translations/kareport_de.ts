@@ -1243,7 +1243,7 @@
     </message>
     <message>
         <location filename="../sources/csv/DelimiterGuess.cpp"/>
-        <source>the delimiter cannot be found out: with a comma, a semicolon, a tab, a vertical bar, or blanks and tabs, the first rows do not have the same number of cells that fit their variables. The delimiter itself was expected</source>
+        <source>the delimiter cannot be detected: with a comma, a semicolon, a tab, a vertical bar, or blanks and tabs, the first rows do not have the same number of cells that fit their variables. The delimiter itself was expected</source>
         <translation>das Trennzeichen ist nicht zu ermitteln: mit Komma, Semikolon, Tabulator, senkrechtem Strich oder Leerzeichen und Tabulatoren haben die ersten Zeilen nicht gleich viele Zellen, die zu ihren Variablen passen. Das Trennzeichen selbst wurde erwartet</translation>
     </message>
     <message>
@@ -1253,7 +1253,7 @@
     </message>
     <message>
         <location filename="../sources/csv/DelimiterGuess.cpp"/>
-        <source>the delimiter cannot be found out: it may be %1. The delimiter itself was expected</source>
+        <source>the delimiter cannot be detected: it may be %1. The delimiter itself was expected</source>
         <translation>das Trennzeichen ist nicht zu ermitteln: möglich sind %1. Das Trennzeichen selbst wurde erwartet</translation>
     </message>
     <message>
@@ -1824,7 +1824,7 @@
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresConnection.cpp"/>
-        <source>the server wants a password: it was expected in the user's own password file (~/.pgpass) or in PGPASSWORD</source>
+        <source>the server asks for a password: it was expected in the user's own password file (~/.pgpass) or in PGPASSWORD</source>
         <translation>der Server verlangt ein Passwort: es wurde in der eigenen Passwortdatei des Benutzers (~/.pgpass) oder in PGPASSWORD erwartet</translation>
     </message>
     <message>
@@ -1979,12 +1979,12 @@
     </message>
     <message>
         <location filename="../jobs/ConditionBinding.cpp"/>
-        <source>values of the variable "%1" are no numbers</source>
+        <source>the values of the variable "%1" are not numbers</source>
         <translation>Werte der Variablen „%1“ sind keine Zahlen</translation>
     </message>
     <message>
         <location filename="../jobs/ConditionBinding.cpp"/>
-        <source>a tolerance from 0 on was expected</source>
+        <source>a tolerance of 0 or more was expected</source>
         <translation>eine Toleranz ab 0 wurde erwartet</translation>
     </message>
     <message>
@@ -2504,7 +2504,7 @@
     </message>
     <message>
         <location filename="../jobs/LandXmlData.cpp"/>
-        <source>the file says its units: "length" alone was expected, which lengths of the job are in</source>
+        <source>the file states its units: "length" alone was expected, which lengths of the job are in</source>
         <translation>die Datei nennt ihre Einheiten: nur „length“ wurde erwartet, die Einheit der Längen im Auftrag</translation>
     </message>
     <message>
@@ -2809,12 +2809,12 @@
     </message>
     <message>
         <location filename="../preview/TemplateEdits.cpp"/>
-        <source>"%1" is no variable: it has a meaning of its own.</source>
+        <source>"%1" cannot be the name of a variable: it has a meaning of its own.</source>
         <translation>„%1“ ist keine Variable: der Name hat eine eigene Bedeutung.</translation>
     </message>
     <message>
         <location filename="../preview/TemplateEdits.cpp"/>
-        <source>There is a variable "%1" already.</source>
+        <source>There is already a variable "%1".</source>
         <translation>Es gibt schon eine Variable „%1“.</translation>
     </message>
     <message>
@@ -2829,7 +2829,7 @@
     </message>
     <message>
         <location filename="../preview/TemplateEdits.cpp"/>
-        <source>The template cannot be read: mend what the list of remarks says first.</source>
+        <source>The template cannot be read: correct what the list of remarks says first.</source>
         <translation>Die Vorlage kann nicht gelesen werden: beheben Sie zuerst, was in der Liste der Anmerkungen steht.</translation>
     </message>
     <message>
@@ -3554,7 +3554,7 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobExport.cpp"/>
-        <source>"%1" is there already, and is no page of "%2": another name was expected</source>
+        <source>"%1" already exists and is not a page of "%2": another name was expected</source>
         <translation>"%1" ist schon vorhanden und keine Seite von "%2": ein anderer Name wurde erwartet</translation>
     </message>
     <message>
@@ -3859,7 +3859,7 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
-        <source>There is a file "%1" already. Replace it?</source>
+        <source>"%1" already exists. Replace it?</source>
         <translation>Die Datei „%1“ gibt es schon. Ersetzen?</translation>
     </message>
     <message>
@@ -4279,7 +4279,7 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/commands/CommandList.cpp"/>
-        <source>No command is called so.</source>
+        <source>No command has this name.</source>
         <translation>Kein Befehl heißt so.</translation>
     </message>
     <message>
@@ -4674,7 +4674,7 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
-        <source>What "%1" is made of has changed. F5 makes it again.</source>
+        <source>Files of "%1" have changed. Press F5 to make it again.</source>
         <translation>Woraus „%1“ erstellt wurde, hat sich geändert. F5 erstellt es neu.</translation>
     </message>
     <message>
@@ -4724,7 +4724,7 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
-        <source>Shows what there was to say when the report was made</source>
+        <source>Shows the notes on the report</source>
         <translation>Zeigt, was beim Erstellen des Berichts zu sagen war</translation>
     </message>
     <message>
@@ -4895,7 +4895,7 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
-        <source>Text to put in its place</source>
+        <source>Replacement text</source>
         <translation>Text, der an seine Stelle kommt</translation>
     </message>
     <message>
@@ -4955,7 +4955,7 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/templates/TemplateWindow.cpp"/>
-        <source>Rows that are made up are shown: %1</source>
+        <source>Sample rows are shown: %1</source>
         <translation>Erfundene Zeilen werden gezeigt: %1</translation>
     </message>
     <message>
@@ -4995,7 +4995,7 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/templates/TemplateWindowFile.cpp"/>
-        <source>Rows that are made up</source>
+        <source>Sample rows</source>
         <translation>Erfundene Zeilen</translation>
     </message>
     <message>

@@ -1243,7 +1243,7 @@
     </message>
     <message>
         <location filename="../sources/csv/DelimiterGuess.cpp"/>
-        <source>the delimiter cannot be found out: with a comma, a semicolon, a tab, a vertical bar, or blanks and tabs, the first rows do not have the same number of cells that fit their variables. The delimiter itself was expected</source>
+        <source>the delimiter cannot be detected: with a comma, a semicolon, a tab, a vertical bar, or blanks and tabs, the first rows do not have the same number of cells that fit their variables. The delimiter itself was expected</source>
         <translation>区切り文字を特定できません: コンマ、セミコロン、タブ、縦棒、空白とタブのいずれでも、最初の行のセル数が一致して変数に合うことはありません。区切り文字そのものが必要です</translation>
     </message>
     <message>
@@ -1253,7 +1253,7 @@
     </message>
     <message>
         <location filename="../sources/csv/DelimiterGuess.cpp"/>
-        <source>the delimiter cannot be found out: it may be %1. The delimiter itself was expected</source>
+        <source>the delimiter cannot be detected: it may be %1. The delimiter itself was expected</source>
         <translation>区切り文字を特定できません: %1 の可能性があります。区切り文字そのものが必要です</translation>
     </message>
     <message>
@@ -1824,7 +1824,7 @@
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresConnection.cpp"/>
-        <source>the server wants a password: it was expected in the user's own password file (~/.pgpass) or in PGPASSWORD</source>
+        <source>the server asks for a password: it was expected in the user's own password file (~/.pgpass) or in PGPASSWORD</source>
         <translation>サーバーがパスワードを求めています: ユーザー自身のパスワードファイル (~/.pgpass) または PGPASSWORD に必要です</translation>
     </message>
     <message>
@@ -1979,12 +1979,12 @@
     </message>
     <message>
         <location filename="../jobs/ConditionBinding.cpp"/>
-        <source>values of the variable "%1" are no numbers</source>
+        <source>the values of the variable "%1" are not numbers</source>
         <translation>変数「%1」の値は数値ではありません</translation>
     </message>
     <message>
         <location filename="../jobs/ConditionBinding.cpp"/>
-        <source>a tolerance from 0 on was expected</source>
+        <source>a tolerance of 0 or more was expected</source>
         <translation>0 以上の許容差が必要です</translation>
     </message>
     <message>
@@ -2504,7 +2504,7 @@
     </message>
     <message>
         <location filename="../jobs/LandXmlData.cpp"/>
-        <source>the file says its units: "length" alone was expected, which lengths of the job are in</source>
+        <source>the file states its units: "length" alone was expected, which lengths of the job are in</source>
         <translation>単位はファイルが示します：ジョブの長さの単位である「length」だけが必要です</translation>
     </message>
     <message>
@@ -2809,12 +2809,12 @@
     </message>
     <message>
         <location filename="../preview/TemplateEdits.cpp"/>
-        <source>"%1" is no variable: it has a meaning of its own.</source>
+        <source>"%1" cannot be the name of a variable: it has a meaning of its own.</source>
         <translation>"%1" は変数ではありません。特別な意味を持つ名前です。</translation>
     </message>
     <message>
         <location filename="../preview/TemplateEdits.cpp"/>
-        <source>There is a variable "%1" already.</source>
+        <source>There is already a variable "%1".</source>
         <translation>変数 "%1" は既にあります。</translation>
     </message>
     <message>
@@ -2829,7 +2829,7 @@
     </message>
     <message>
         <location filename="../preview/TemplateEdits.cpp"/>
-        <source>The template cannot be read: mend what the list of remarks says first.</source>
+        <source>The template cannot be read: correct what the list of remarks says first.</source>
         <translation>テンプレートを読み取れません。先に指摘の一覧の内容を直してください。</translation>
     </message>
     <message>
@@ -3554,7 +3554,7 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobExport.cpp"/>
-        <source>"%1" is there already, and is no page of "%2": another name was expected</source>
+        <source>"%1" already exists and is not a page of "%2": another name was expected</source>
         <translation>「%1」はすでにあり、「%2」のページではありません。別の名前が必要です</translation>
     </message>
     <message>
@@ -3859,7 +3859,7 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
-        <source>There is a file "%1" already. Replace it?</source>
+        <source>"%1" already exists. Replace it?</source>
         <translation>ファイル「%1」は既にあります。置き換えますか?</translation>
     </message>
     <message>
@@ -4279,7 +4279,7 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/commands/CommandList.cpp"/>
-        <source>No command is called so.</source>
+        <source>No command has this name.</source>
         <translation>該当するコマンドはありません。</translation>
     </message>
     <message>
@@ -4674,7 +4674,7 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
-        <source>What "%1" is made of has changed. F5 makes it again.</source>
+        <source>Files of "%1" have changed. Press F5 to make it again.</source>
         <translation>「%1」の元のファイルが変更されました。F5 で作成し直します。</translation>
     </message>
     <message>
@@ -4724,7 +4724,7 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/run/DeskRunsFront.cpp"/>
-        <source>Shows what there was to say when the report was made</source>
+        <source>Shows the notes on the report</source>
         <translation>レポートの作成時の注意を表示します</translation>
     </message>
     <message>
@@ -4895,7 +4895,7 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/templates/TemplateFindBar.cpp"/>
-        <source>Text to put in its place</source>
+        <source>Replacement text</source>
         <translation>置き換える文字列</translation>
     </message>
     <message>
@@ -4955,7 +4955,7 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/templates/TemplateWindow.cpp"/>
-        <source>Rows that are made up are shown: %1</source>
+        <source>Sample rows are shown: %1</source>
         <translation>仮の行を表示しています: %1</translation>
     </message>
     <message>
@@ -4995,7 +4995,7 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/templates/TemplateWindowFile.cpp"/>
-        <source>Rows that are made up</source>
+        <source>Sample rows</source>
         <translation>仮の行</translation>
     </message>
     <message>

@@ -35,7 +35,7 @@ QString wrongExport(const Job &job, const QString &path)
     return wrong ? wrong->text : QString();
 }
 
-/// What keeps the further pages of a web page from being written: nobody was asked whether they may replace other files.
+/// What keeps the further pages of a web page from being written: the user was not asked whether they may replace other files.
 /// @param pages  the first one, then the others
 QString wrongPage(const std::vector<Output> &pages)
 {
@@ -46,7 +46,7 @@ QString wrongPage(const std::vector<Output> &pages)
                                                HtmlResult::isPage(file.read(longestHead),
                                                                   QFileInfo(pages.front().file).fileName(), i + 1));
         if (!isOurs) {
-            return Xlate("\"%1\" is there already, and is no page of \"%2\": another name was expected")
+            return Xlate("\"%1\" already exists and is not a page of \"%2\": another name was expected")
                 .arg(pages[i].file, pages.front().file);
         }
     }

@@ -95,7 +95,7 @@ UReportDoc *makeReport(const Job &job, const JsonSource &source, QWidget *parent
     return report;
 }
 
-/// Runs a job that has been read, aside, and puts what it makes into a report. @return whether it did
+/// Runs a job that has been read into a new report, and puts that into a shown one. @return whether it did
 bool makeAgain(UReportDoc &report, const Job &job, const JsonSource &source, QWidget *parent, LaunchResult &result,
                const LaunchHooks &hooks)
 {

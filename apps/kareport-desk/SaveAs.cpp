@@ -95,8 +95,8 @@ bool mayReplace(const QString &path, const SaveRequest &request)
     if ((request.flags & SaveRequest::overwritePrompt) == 0 || !QFileInfo::exists(path)) {
         return true;
     }
-    return showMessage({Xlate("There is a file \"%1\" already. Replace it?").arg(path), QString(),
-                        MessageButtons::YesNo, MessageIcon::Question}) == MessageAnswer::Yes;
+    return showMessage({Xlate("\"%1\" already exists. Replace it?").arg(path), QString(), MessageButtons::YesNo,
+                        MessageIcon::Question}) == MessageAnswer::Yes;
 }
 
 /// Puts a name into the dialog. A file that has it is not selected: what is typed over the name would be added to it.

@@ -32,7 +32,7 @@ Value chosenIn(const QComboBox &box)
     return static_cast<Value>(box.currentData().toInt());
 }
 
-/// Shows a value as if it had been chosen, and tells nobody.
+/// Shows a value as if it had been chosen, without a signal.
 template <typename Value>
 void display(QComboBox &box, Value value)
 {

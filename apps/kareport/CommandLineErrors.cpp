@@ -26,7 +26,7 @@ QString commandForFile(const QString &word)
     return {};
 }
 
-/// A sentence about an option that nobody knows. @param owner  the command, or the program
+/// A sentence about an unknown option. @param owner  the command, or the program
 QString unknownOption(const QString &owner, const QString &word, const QStringList &names)
 {
     const auto withoutDashes = [](QString name) {

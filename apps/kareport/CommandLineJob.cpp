@@ -181,7 +181,7 @@ ExitStatus CommandLineJob::run(Progress &progress)
             return status_ = withNotes(*status);
         }
     }
-    // Where nobody wants the text, it is not kept.
+    // Where no output needs the text, it is not kept.
     SizeLimit nowhere(nullptr, std::numeric_limits<qint64>::max());
     ReportTextWriter noText(nowhere, LineEnds::PlainText);
     const auto error = make(runner, report, ResultOutputs::isTextUnwanted(job_) ? &noText : nullptr);

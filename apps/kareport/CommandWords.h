@@ -53,7 +53,7 @@ struct CommandWords
     std::vector<OptionWords> arguments;
 };
 
-/// The endings of the files of a kind, without their dots; empty for any file, and for what is no file.
+/// The endings of the files of a kind, without their dots; empty for any file, and for what is not a file.
 QStringList endingsOf(ArgumentKind kind);
 
 /// The values of a kind that are always the same; empty where they depend on something else. Of KEY=VALUE, a key whose values are

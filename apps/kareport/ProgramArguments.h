@@ -4,7 +4,7 @@ namespace kareport
 {
 
 /// The words of a command line in the bytes that `textOfSystem` reads: those that a program is given, or where the system
-/// has better ones, these. Names with * and ? stand for the files that they fit, where no shell has seen to that.
+/// has better ones, these. Names with * and ? are replaced by the files that they match, where no shell has done so.
 struct ProgramArguments
 {
     int count = 0;

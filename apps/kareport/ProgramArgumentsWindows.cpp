@@ -30,7 +30,7 @@ QStringList givenWords()
     return words;
 }
 
-/// The files that a name with * or ? in its last part stands for, by their names; the word itself where there are none, as in
+/// The files that match a name with * or ? in its last part, by their names; the word itself where there are none, as in
 /// a shell.
 QStringList filesOf(const QString &word)
 {

@@ -15,7 +15,7 @@ namespace kareport
 namespace
 {
 
-/// A text as it stands between the quotes of a JSON text.
+/// A text as it is written between the quotes of a JSON text.
 QByteArray inJson(const QString &text)
 {
     constexpr qsizetype brackets = 2; // and quotes
@@ -32,7 +32,7 @@ std::vector<StarterFile> starterFiles(const QString &name, const QString &title)
     for (const char *ending : {".xml", ".csv", ".json"}) {
         QFile file(QStringLiteral(":/kareport/starter") + QLatin1StringView(ending));
         file.open(QIODevice::ReadOnly); // it is part of the program
-        // The marks stand in the job alone.
+        // The marks are in the job alone.
         const QByteArray bytes = file.readAll().replace("@FILE@", inJson(name)).replace("@TITLE@", inJson(title));
         files.push_back({name + QLatin1StringView(ending), bytes});
     }

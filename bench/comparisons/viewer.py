@@ -37,7 +37,7 @@ class Watched:
                                         stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL)
 
     def shown(self):
-        """Seconds from the start until the text stands in the window."""
+        """Seconds from the start until the text is in the window."""
         while (window := self.screen.window()) is None:
             if time.perf_counter() - self.begin > 60 or self.process.poll() is not None:
                 return None

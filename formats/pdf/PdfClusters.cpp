@@ -18,7 +18,7 @@ constexpr double mostStretch = 1.25;
 /// Between a letter's ink and that of a mark.
 constexpr double gap = 40;
 
-bool standsAbove(char32_t mark)
+bool isAboveLetter(char32_t mark)
 {
     switch (QChar::combiningClass(mark)) {
     case QChar::Combining_AboveLeft:
@@ -29,7 +29,7 @@ bool standsAbove(char32_t mark)
     }
 }
 
-bool standsBelow(char32_t mark)
+bool isBelowLetter(char32_t mark)
 {
     switch (QChar::combiningClass(mark)) {
     case QChar::Combining_BelowLeft:
@@ -194,10 +194,10 @@ void PdfClusters::putMark(PdfCluster &cluster, char32_t mark, QRectF &ink)
     PdfGlyph glyph{font, code, 0, 0, 1, static_cast<double>((*fonts_)[font].advanceOf(code))};
     const QRectF own = (*fonts_)[font].inkOf(code);
     glyph.left = ink.center().x() - own.center().x();
-    if (standsAbove(mark)) {
+    if (isAboveLetter(mark)) {
         glyph.rise = std::max(0.0, ink.bottom() + gap - own.top());
         ink.setBottom(std::max(ink.bottom(), own.bottom() + glyph.rise));
-    } else if (standsBelow(mark)) {
+    } else if (isBelowLetter(mark)) {
         glyph.rise = std::min(0.0, ink.top() - gap - own.bottom());
         ink.setTop(std::min(ink.top(), own.top() + glyph.rise));
     }

@@ -42,7 +42,7 @@ public:
     /// @param pdf    where the fonts are embedded as they are needed
     /// @param fonts  the first one, which is embedded, makes the grid; they outlive this object
     /// @param cell   the advance of a cell
-    /// @param substitute  stands for characters that no face has
+    /// @param substitute  takes the place of characters that no face has
     void begin(PdfDocument &pdf, std::vector<PdfFont> &fonts, int cell, char16_t substitute);
 
     /// The cluster that a piece of text is, which `clusterEnd` has cut, with the faces and glyphs that it needs embedded. The

@@ -87,7 +87,7 @@ private:
         const std::vector<PdfFace> faces = orderPdfFaces(preferred, fixedPitchPdfFaces());
         if (faces.empty()) {
             return fail(Xlate("no fixed-pitch font was found: one of %1 was expected")
-                            .arg(standInFaces().join(QStringLiteral(", "))));
+                            .arg(substituteFaces().join(QStringLiteral(", "))));
         }
         return typesetter_.begin(faces, characters) || fail(libraryError());
     }

@@ -110,7 +110,7 @@ std::vector<PdfFace> fixedPitchPdfFaces()
 {
     // The last two have the characters of Chinese and Japanese.
     const QStringList families =
-        standInFaces() + QStringList{QStringLiteral("WenQuanYi Zen Hei Mono"), QStringLiteral("WenQuanYi Zen Hei")};
+        substituteFaces() + QStringList{QStringLiteral("WenQuanYi Zen Hei Mono"), QStringLiteral("WenQuanYi Zen Hei")};
     std::vector<PdfFace> faces;
     for (const QString &family : families) {
         if (auto face = faceOfFamily(family.toLatin1().constData())) {

@@ -19,7 +19,7 @@ namespace kareport
 struct RichTextNotes
 {
     int pictures = 0;
-    int objects = 0;   ///< embedded or linked; the text that stands in for one is shown
+    int objects = 0;   ///< embedded or linked; the text that takes its place is shown
     int footnotes = 0; ///< and endnotes and annotations
     int headers = 0;   ///< page headers and footers
     int hidden = 0;    ///< texts that are marked as hidden
@@ -57,7 +57,7 @@ std::optional<RichTextError> readRichText(QByteArrayView bytes, QTextDocument &d
 /// error as well.
 std::optional<RichTextError> readRichTextCharacters(QByteArrayView bytes, QString &text,
                                                     RichTextNotes *notes = nullptr);
-/// Reads into a document a rich text in memory, in which characters from U+0080 on stand for themselves.
+/// Reads into a document a rich text in memory, in which characters from U+0080 on are themselves.
 std::optional<RichTextError> readRichText(QStringView text, QTextDocument &document, RichTextNotes *notes = nullptr);
 
 } // namespace kareport

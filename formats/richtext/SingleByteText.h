@@ -7,7 +7,7 @@ class QIODevice;
 namespace kareport
 {
 
-/// What stands for a character that has no byte of its own.
+/// Takes the place of a character that has no byte of its own.
 enum class WideCharacters
 {
     RichTextEscape, ///< `\uN?` for each UTF-16 unit, N as a signed number, as rich text has it

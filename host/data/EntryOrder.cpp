@@ -13,7 +13,7 @@ std::weak_ordering compareFolded(QStringView left, QStringView right)
     return left.compare(right, Qt::CaseInsensitive) <=> 0;
 }
 
-/// Where an entry stands among the numbers, true and false as 1 and 0; nothing where it is no number.
+/// The number that an entry sorts as, true and false as 1 and 0; nothing where it is not a number.
 std::optional<double> rankOf(const UDictEntry &entry)
 {
     const bool *truth = std::get_if<bool>(&entry.value());

@@ -60,7 +60,7 @@ struct UDocTemplate::UnfinishedDocument
     UnfinishedDocument &operator=(const UnfinishedDocument &) = delete;
 
     // Like the template's functions of these names, but that they throw when memory ends: without a pane of its own, a
-    // document would be made that nobody sees.
+    // document would be made that is not shown.
     static UDocument *open(UDocTemplate &docTemplate, const QString &path, bool makeVisible, CViewPane *pane,
                            unsigned style, const QRect *rect);
     static CViewPane *createPane(UDocTemplate &docTemplate, UDocument *document, CViewPane *parent, unsigned style,

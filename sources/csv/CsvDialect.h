@@ -18,7 +18,7 @@ enum class DelimiterKind
 {
     Character,
     Whitespace, ///< blanks and tabs, as many as there are
-    Automatic   ///< found out from the first rows; two possible readings are an error
+    Automatic   ///< detected from the first rows; two possible readings are an error
 };
 
 /// How a file of rows and cells is written. By default: RFC 4180 in UTF-8, with a header row.
@@ -42,7 +42,7 @@ struct CsvDialect
 
 /// The names of columns of a short form: P is Number, N Northing, E Easting, Z Elevation and D Description, in any case and
 /// any order, each once; "-" is a column that is skipped and has no name.
-/// @return nothing when the text is no such form
+/// @return nothing when the text is not of this form
 std::optional<QStringList> namesOfOrder(QStringView order);
 
 } // namespace kareport

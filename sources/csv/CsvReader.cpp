@@ -76,7 +76,7 @@ bool CsvReader::next()
     if (hasHighBytes_ && !isUtf8(row)) {
         std::size_t good = 0;
         while (good < row.size()) {
-            // The longest valid beginning ends before the first byte that is no part of a character.
+            // The longest valid beginning ends before the first byte that is not part of a character.
             const unsigned char lead = static_cast<unsigned char>(row[good]);
             const std::size_t length = lead < 0x80 ? 1 : lead < 0xE0 ? 2 : lead < 0xF0 ? 3 : 4;
             if (!isUtf8(row.substr(good, length))) {

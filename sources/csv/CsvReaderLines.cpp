@@ -13,7 +13,7 @@ void CsvReader::skipLines()
     }
 }
 
-/// Passes over lines that are no rows. @return false when something is wrong with one
+/// Passes over lines that are not rows. @return false when something is wrong with one
 bool CsvReader::passOverLines()
 {
     while (position_ < bytes_.size() && isPassedOver()) {
@@ -55,7 +55,7 @@ bool CsvReader::passOverLine()
     return true;
 }
 
-/// Blank lines at the end of the file are no rows.
+/// Blank lines at the end of the file are not rows.
 bool CsvReader::skipEmptyEnd()
 {
     // What was looked over once is not looked over again for each of its lines.

@@ -129,7 +129,7 @@ const CsvDialect *clearlyWrong(const std::vector<Failure> &failures)
 
 InputError noneIsPossible(const QString &path, const std::vector<Failure> &failures)
 {
-    QString text = Xlate("the delimiter cannot be found out: with a comma, a semicolon, a tab, a vertical bar, or "
+    QString text = Xlate("the delimiter cannot be detected: with a comma, a semicolon, a tab, a vertical bar, or "
                          "blanks and tabs, the first rows do not have the same number of cells that fit their "
                          "variables. The delimiter itself was expected");
     for (const Failure &failure : failures) {
@@ -159,7 +159,7 @@ Expected<CsvDialect> only(const QString &path, const std::vector<Reading> &possi
         names.append(nameOf(reading.dialect));
     }
     return InputError{path, std::nullopt,
-                      Xlate("the delimiter cannot be found out: it may be %1. The delimiter itself was expected")
+                      Xlate("the delimiter cannot be detected: it may be %1. The delimiter itself was expected")
                           .arg(names.join(Xlate(" or @@between two delimiters")))};
 }
 

@@ -14,7 +14,7 @@ namespace kareport
 /// asked for.
 ///
 /// The keys of the objects are the columns. They show while the rows are read: `reader().columns()` is complete after the
-/// last row. null is no value, nor is a key that an object does not have.
+/// last row. null is a missing value, and so is a key that an object does not have.
 class JsonFileList : public RowObjectList
 {
 public:

@@ -47,7 +47,7 @@ JsonFileRows::JsonFileRows(std::shared_ptr<const FileBytes> file, const std::vec
         return;
     }
     rewind();
-    // What is no such file is said before anything is read.
+    // A file that is not JSON is reported before anything is read.
     if (findObject() || !error_) {
         rewind();
     }
@@ -159,7 +159,7 @@ bool JsonFileRows::endList()
 /// Looks at the end whether what was asked for was there. @return false
 bool JsonFileRows::endRows()
 {
-    isComplete_ = rowNumber_ > 0; // without an object nobody knows what keys there would be
+    isComplete_ = rowNumber_ > 0; // without an object the keys are not known
     const auto wrong = rowNumber_ > 0 ? keys_.whatIsMissing(columns_) : std::nullopt;
     if (wrong) {
         error_ = InputError{file_->path(), std::nullopt, *wrong};

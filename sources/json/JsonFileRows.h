@@ -17,7 +17,7 @@ namespace kareport
 class JsonFileRows : public RowReader, private JsonRowHandler
 {
 public:
-    /// Longer objects are taken for something that is no row.
+    /// Longer objects are taken for something that is not a row.
     static constexpr std::size_t longestRow = std::size_t(1) << 20;
 
     JsonFileRows(std::shared_ptr<const FileBytes> file, const std::vector<ColumnChoice> &columns,

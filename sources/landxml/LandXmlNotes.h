@@ -22,7 +22,7 @@ public:
     explicit LandXmlNotes(std::shared_ptr<const FileBytes> file) : file_(std::move(file)) {}
 
     void add(std::size_t byte, const QString &text);
-    /// Adds what is said of the file as a whole, and is no difference.
+    /// Adds what is said of the file as a whole, and is not a difference.
     void addOfFile(const QString &text);
     /// Counts elements that no list reads, or that are in one.
     void leaveOut(std::string_view element, std::size_t count = 1);

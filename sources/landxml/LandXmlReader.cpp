@@ -165,7 +165,7 @@ XmlHandler::Interest LandXmlReader::beginInAlignment(Tag tag, const XmlAttribute
     }
 }
 
-/// Whether a list of points in the element at hand is wanted.
+/// Whether a list of points in the current element is wanted.
 bool LandXmlReader::isListRead() const
 {
     switch (open_.back().tag) {

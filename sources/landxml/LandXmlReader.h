@@ -24,7 +24,7 @@ struct LandXmlWants
     bool gradeSurfaces = false; ///< the widths beside alignments
 
     /// The alignment, the parcel, and the group or surface of points that are asked for by their names; all where a name is
-    /// empty. A number that cannot be read in another one is noted, and is no error.
+    /// empty. A number that cannot be read in another one is noted, and is not an error.
     std::string alignment;
     std::string parcel;
     std::string owner;
@@ -133,7 +133,7 @@ private:
     std::vector<std::string> owners_;
     std::vector<bool> isSurface_;         ///< of the owners
     std::vector<std::size_t> openOwners_; ///< their indexes, the innermost last
-    bool isInGradeModel_ = false;         ///< its widths are listed as they are: a wrong one is no error
+    bool isInGradeModel_ = false;         ///< its widths are listed as they are: a wrong one is not an error
     bool isZoneRight_ = false;            ///< the zones that are open
     bool isInAlignment_ = false;          ///< one that is wanted is open
     bool isInPoint_ = false;              ///< one that is wanted is open

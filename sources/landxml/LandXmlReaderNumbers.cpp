@@ -36,7 +36,7 @@ bool LandXmlReader::isNeeded() const
     return !isInAlignment_ || isAskedFor(wants_.alignment, alignments.back().name);
 }
 
-/// Ends the reading because of a number that cannot be read; where nobody asked for it, it is noted.
+/// Ends the reading because of a number that cannot be read; where it was not asked for, it is noted.
 void LandXmlReader::failNumber(std::size_t byte, const QString &text)
 {
     if (isNeeded()) {

@@ -135,7 +135,7 @@ const LandXmlPointTable *LandXmlRows::pointTable()
         LandXmlNotes unheard(source_.file); // the pass that makes the rows has them, too
         LandXmlWants wants;
         wants.points = true;
-        wants.isForReferences = true; // one that nobody refers to may be wrong
+        wants.isForReferences = true; // one that is not referred to may be wrong
         LandXmlReader reader(source_.file, source_.header.units, wants, unheard);
         for (bool isMore = true; isMore;) {
             isMore = reader.readSome();

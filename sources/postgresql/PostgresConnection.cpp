@@ -104,7 +104,7 @@ bool PostgresConnection::connect(const QByteArray &connection)
         error_ =
             InputError{name_, std::nullopt,
                        pq_.connectionNeedsPassword(connection_) != 0
-                           ? Xlate("the server wants a password: it was expected in the user's own password file "
+                           ? Xlate("the server asks for a password: it was expected in the user's own password file "
                                    "(~/.pgpass) or in PGPASSWORD")
                            : Xlate("the server cannot be connected to: %1").arg(lineOf(pq_.errorMessage(connection_)))};
         return false;

@@ -26,7 +26,7 @@ struct PostgresQuery
 
 /// The rows of a PostgreSQL database as data objects.
 ///
-/// They come one by one, in a transaction that only reads and sees one state of the database; NULL is no value. A password
+/// They come one by one, in a transaction that only reads and sees one state of the database; NULL is a missing value. A password
 /// comes from the user's own password file or environment. Where a column holds PostGIS geometries, or is the only one of
 /// bytes, there are the columns @x, @y and @z of its points, @srs, their reference system as "EPSG:25832", and @srsName,
 /// its name: variables are read from them where they are chosen.

@@ -101,7 +101,7 @@ SqliteFile::SqliteFile(const QString &path) : path_(path)
     }
     configure();
     if (begin()) {
-        // Not before: what a program has written that the lock was waited for is no change.
+        // Not before the lock is had: what another program wrote until then is not a change during the reading.
         const QFileInfo locked(path);
         size_ = locked.size();
         modified_ = locked.lastModified();
@@ -120,7 +120,7 @@ void SqliteFile::configure()
     sqlite3_limit(database_, SQLITE_LIMIT_LENGTH, largestValue);
     sqlite3_progress_handler(database_, stepsBetween, lookWhetherToStop, this);
     sqlite3_busy_handler(database_, waitForLock, this);
-    // What a file brings along is not run, its log stays as it is, and a misspelt name in quotes is no text.
+    // Code in the file is not run, its log stays as it is, and a misspelt name in quotes is not taken for a text.
     sqlite3_db_config(database_, SQLITE_DBCONFIG_DEFENSIVE, 1, nullptr);
     sqlite3_db_config(database_, SQLITE_DBCONFIG_TRUSTED_SCHEMA, 0, nullptr);
     sqlite3_db_config(database_, SQLITE_DBCONFIG_NO_CKPT_ON_CLOSE, 1, nullptr);

@@ -24,7 +24,7 @@ struct SqliteQuery
 
 /// The rows of a SQLite database as data objects.
 ///
-/// The database is opened for reading only and all rows are of one state of it; NULL is no value. Where a column holds the
+/// The database is opened for reading only and all rows are of one state of it; NULL is a missing value. Where a column holds the
 /// geometries of a GeoPackage there are the columns @x, @y and @z of its points, @srs, their reference system as
 /// "EPSG:25832", and @srsName, its name: variables are read from them where they are chosen.
 class SqliteObjectList : public RowObjectList

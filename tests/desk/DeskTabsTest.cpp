@@ -190,7 +190,7 @@ TEST(DeskTabs, WhatWasOpenIsOpenedAgainWhereThatIsWanted)
     for (const char *name : {"a.rep", "gone.rep", "job.json", "b.rep"}) {
         ASSERT_TRUE(desk.frame->OpenFile(folder.path(name)));
     }
-    ASSERT_TRUE(desk.frame->OnCommand(fileNewCommand)); // which nobody has saved
+    ASSERT_TRUE(desk.frame->OnCommand(fileNewCommand)); // which has not been saved
     ASSERT_TRUE(desk.frame->OpenFile(folder.path("a.rep")));
     settle();
     desk.frame->close();

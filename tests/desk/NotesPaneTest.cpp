@@ -22,7 +22,7 @@
 namespace
 {
 
-/// A desk with a report that there is something to say of: a column that nobody knows, and values that are too wide.
+/// A desk with a report that has notes: an unknown column, and values that are too wide.
 class NotedDesk : public TableDesk
 {
 public:
@@ -61,7 +61,7 @@ TEST(NotesPane, ListsWhatThereIsToSay)
 {
     NotedDesk desk;
     ASSERT_NE(desk.report, nullptr);
-    EXPECT_TRUE(desk.messages.isEmpty()) << "nobody has to answer";
+    EXPECT_TRUE(desk.messages.isEmpty()) << "there is nothing to answer";
     EXPECT_TRUE(desk.pane().isVisible());
     ASSERT_EQ(desk.pane().count(), 2);
     const QTreeWidgetItem *column = desk.row("Unknown column");

@@ -314,7 +314,7 @@ TEST(RunAgain, AFileThatIsCutOffOrGoneLeavesTheReport)
     desk.folder.put("p.csv", "Number,North\n1,2,");
     EXPECT_TRUE(desk.says("was not made again"));
     EXPECT_EQ(Desk::textOf(*desk.report), before);
-    EXPECT_TRUE(desk.messages.isEmpty()) << "nobody has to answer for a file that is not whole yet";
+    EXPECT_TRUE(desk.messages.isEmpty()) << "a file that is not complete yet is not an error";
     kareport::NotesPane &pane = desk.frame->runs().notesPane();
     EXPECT_TRUE(pane.isVisible());
     EXPECT_EQ(pane.count(), 1);

@@ -76,7 +76,7 @@ TEST(StartPage, ListsRecentFilesWithTheirPlaceAndGreysWhatIsGone)
     pageOf(desk).refresh();
     EntryList &recent = pageOf(desk).recentList();
     ASSERT_EQ(recent.count(), 2);
-    EXPECT_EQ(recent.item(0)->text(), QStringLiteral("<b>gone.rep")) << "a name is no markup";
+    EXPECT_EQ(recent.item(0)->text(), QStringLiteral("<b>gone.rep")) << "a name is not markup";
     EXPECT_TRUE(accessibleTextOf(recent, 0).endsWith(QStringLiteral("not there")));
     EXPECT_TRUE(accessibleTextOf(recent, 1).contains(folder.path())) << accessibleTextOf(recent, 1).toStdString();
     const QString time =
@@ -154,7 +154,7 @@ TEST(StartPage, AnExampleIsOpenedAsUntitledWorkAndNothingIsWrittenBesideIt)
     const UReportDoc *report = Desk::reports().front();
     EXPECT_TRUE(report->GetPathName().isEmpty());
     EXPECT_FALSE(report->IsEmpty());
-    EXPECT_TRUE(UApplication::Get()->GetRecentFileList().isEmpty()) << "it is no file of the user's";
+    EXPECT_TRUE(UApplication::Get()->GetRecentFileList().isEmpty()) << "it is not a file of the user's";
     SaveRequest asked;
     desk.frame->askExportFile = [&asked](const SaveRequest &request) -> std::optional<SaveChoice> {
         asked = request;

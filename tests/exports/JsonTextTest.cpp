@@ -22,7 +22,7 @@ TEST(JsonText, WhatWouldEndOrChangeATextIsEscaped)
     EXPECT_EQ(jsonOf(u"a\"b\\c"), R"("a\"b\\c")");
     EXPECT_EQ(jsonOf(u"1\n2\r3\t4"), R"("1\n2\r3\t4")");
     EXPECT_EQ(jsonOf(u"\u0001\u001f"), R"("\u0001\u001f")");
-    EXPECT_EQ(jsonOf(u"</script>"), R"("</script>")") << "it is no part of a page";
+    EXPECT_EQ(jsonOf(u"</script>"), R"("</script>")") << "it is not part of a page";
     EXPECT_EQ(jsonOf(u"\u00e4\u2028"), "\"\xC3\xA4\xE2\x80\xA8\"");
 }
 

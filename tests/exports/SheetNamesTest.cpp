@@ -20,7 +20,7 @@ TEST(SheetNames, WhatNoProgramTakesIsReplaced)
     };
     const Row rows[] = {
         {QStringLiteral("Points"), QStringLiteral("Points"), "a good name"},
-        {QStringLiteral("a:b\\c/d?e*f[g]h"), QStringLiteral("a_b_c_d_e_f_g_h"), "characters that are no part of one"},
+        {QStringLiteral("a:b\\c/d?e*f[g]h"), QStringLiteral("a_b_c_d_e_f_g_h"), "characters that are not part of one"},
         {QStringLiteral("'a'"), QStringLiteral("_a_"), "apostrophes at the ends"},
         {QStringLiteral("a'b"), QStringLiteral("a'b"), "and inside"},
         {QString(), QStringLiteral("_"), "no name"},

@@ -95,7 +95,7 @@ TEST(SheetNumber, WhatShowsNoNumberIsNone)
     EXPECT_FALSE(numberOf(VARIABLE_COORDINATE, u"????"));
     EXPECT_FALSE(
         kareport::sheetNumber(columnOf(VARIABLE_COORDINATE), {nullptr, u"0.000"}, settings, ResultValues::Printed))
-        << "what is missing is no zero";
+        << "what is missing is not a zero";
 }
 
 } // namespace

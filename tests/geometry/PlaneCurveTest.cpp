@@ -186,7 +186,7 @@ TEST(PlaneCurve, WhatHasNoAnswerIsSaid)
         {clothoid, 0, 0, -1, 0, 0, CurveFault::NoLength, "a way back"},
         {clothoid, 0, 0, 1e9, 1, 1, CurveFault::TooManyTurns, "an arc like a coil"},
         {clothoid, 0, 0, 1e300, 0, 1e300, CurveFault::TooManyTurns, "turns that no number counts"},
-        {TransitionForm::CubicParabola, 0, 0, 10, 0.1, 0.2, CurveFault::NoStraightEnd, "no tangent to stand over"},
+        {TransitionForm::CubicParabola, 0, 0, 10, 0.1, 0.2, CurveFault::NoStraightEnd, "no tangent to be over"},
         {TransitionForm::SineHalfWave, 0, 0, 50, 0, 0.1, CurveFault::TooSteep, "it would rise above its tangent"},
         {TransitionForm::CubicParabola, 0, 0, 1000, 0, 50, CurveFault::TooSteep, "it would rise out of sight"},
     };

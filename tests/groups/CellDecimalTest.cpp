@@ -41,7 +41,7 @@ TEST(CellReader, GivesTheNumberOfTheCellBack)
         {-12.345, 1, "-12345e-3", "below 0"},
         {1.0005, 1, "10005e-4", "more decimals than the reader begins with"},
         {123456789012345, 1, "123456789012345e0", "15 digits"},
-        {0.000123456789012345, 1, "123456789012345e-18", "15 digits behind many zeros"},
+        {0.000123456789012345, 1, "123456789012345e-18", "15 digits after many zeros"},
         {1e300, 1, "1e300", "a large number"},
         {5e-324, 1, "5e-324", "the least number"},
         {0.1 + 0.2, 1, "30000000000000004e-17", "17 digits: the shortest decimal of the double"},

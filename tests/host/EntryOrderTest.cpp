@@ -27,7 +27,7 @@ TEST(EntryOrder, ANumberIsOneWhateverItsSize)
         {qint16(-7), -7.0, "16 bits"},
         {std::numeric_limits<qint32>::max(), 2147483647.0, "32 bits"},
         {0.25, 0.25, "with decimals"},
-        {true, std::nullopt, "a truth is no number to add up or to compare with a limit"},
+        {true, std::nullopt, "a truth is not a number to add up or to compare with a limit"},
         {QStringLiteral("7"), std::nullopt, "a text"},
         {UPointNumber(QStringLiteral("7")), std::nullopt, "the number of a point is a text"},
     };

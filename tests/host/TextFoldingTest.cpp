@@ -77,7 +77,7 @@ TEST(TextFolding, KeysAndComparisonAgreeOnEveryCharacter)
 
 TEST(TextFolding, HalvesOfSurrogatePairsStayDifferent)
 {
-    // A cut can leave one behind.
+    // A cut can leave one.
     const QString first(QChar(0xD83D));
     const QString second(QChar(0xD83E));
     EXPECT_FALSE(equalFolded(first, second));

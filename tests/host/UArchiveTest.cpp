@@ -75,7 +75,7 @@ TEST(UArchive, ThatWasGivenUpWritesNothingMore)
     archive.Write("before");
     archive.Abandon();
     EXPECT_FALSE(archive.IsGood());
-    archive.Write("behind");
+    archive.Write("after");
     archive.Abandon();
     EXPECT_FALSE(archive.IsGood()) << "for good";
     EXPECT_EQ(buffer.data(), QByteArray("before"));

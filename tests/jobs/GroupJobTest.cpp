@@ -154,7 +154,7 @@ TEST(GroupJob, RunsOverRows)
     TestJob test;
     const QString text = run(test, R"("table": "Sorted", "data": "v", "groups": [{"by": "Layer"}],
         "running": [{"variable": "Area", "sum": "Length", "per": "group"}])");
-    EXPECT_TRUE(text.contains(u"cannot take that")) << "a sum of lengths is no area: " << text.toStdString();
+    EXPECT_TRUE(text.contains(u"cannot take that")) << "a sum of lengths is not an area: " << text.toStdString();
     const QByteArray data = R"("v": {"values": [{"Number": "1", "Length": 0.1}, {"Number": "2", "Length": 0.2},
         {"Number": "2", "Length": 0.4}]})";
     const QString shown = run(test, R"("table": "Wide", "data": "v", "sort": "Number", "groups": [{"by": "Number"}],
@@ -227,7 +227,7 @@ TEST(GroupJob, SaysWhatIsInNoTotal)
         "1 value of the variable \"Length\" is missing and in no total of the table \"Wide\", in row 2",
         "2 values of the variable \"Length\" are infinite or not a number and in no total of the table \"Wide\", the "
         "first one in row 3"};
-    EXPECT_EQ(notes, expected) << "a text that is only counted is no reason for one";
+    EXPECT_EQ(notes, expected) << "a text that is only counted is not a reason for one";
 }
 
 } // namespace

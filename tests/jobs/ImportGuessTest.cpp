@@ -69,7 +69,7 @@ TEST(ImportGuess, FindsOutHowAFileIsWritten)
         {"Number;Northing\n1;2,5\n", {{"delimiter", ";"}, {"decimal", ","}}, "a spreadsheet of another country"},
         {"Number\tNorthing\n1\t2.5\n", option("delimiter", "\t"), "tabs"},
         {"Number Northing\n1   2.5\n", option("delimiter", "whitespace"), "blanks"},
-        {"Pt;N;E\n1;2,5;3\n", {{"delimiter", ";"}, {"decimal", ","}}, "names that are no variables"},
+        {"Pt;N;E\n1;2,5;3\n", {{"delimiter", ";"}, {"decimal", ","}}, "names that are not variables"},
         {"1,2.5,3,4,oak\n2,3.5,4,5,elm\n", {{"header", false}, {"order", "PNEZD"}}, "points without names"},
         {"1;2,5;3\n2;3;4\n",
          {{"delimiter", ";"}, {"decimal", ","}, {"header", false}, {"order", "PNE"}},

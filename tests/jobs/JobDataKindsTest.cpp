@@ -44,7 +44,7 @@ TEST(JobDataKinds, OneReportComesOfTextsOfEveryHabit)
     };
     const Row rows[] = {
         {"Number Northing\n1   12.5\n  2A\t0\n", R"("delimiter": "whitespace")", "blanks and tabs"},
-        {"Number;Northing\n1;12.5\n2A;0\n", R"("delimiter": "auto")", "a semicolon that is found out"},
+        {"Number;Northing\n1;12.5\n2A;0\n", R"("delimiter": "auto")", "a semicolon that is detected"},
         {"1,12.5\n2A,0\n", R"("header": false, "columns": ["Number", "Northing"])", "columns by their positions"},
         {"a,b,c\n1,?,12.5\n2A,?,0\n", R"("columns": ["Number", "-", "Northing"])", "instead of a header row's names"},
         {"1,?,12.5\n2A,?,0\n", R"("header": false, "columns": ["Number", null, "Northing"])", "one skipped"},

@@ -26,7 +26,7 @@ TEST(JobFiles, WhatIsWatchedNeedNotBeThere)
          "a.csv c.json job.json", "data in files"},
         {R"({"report": [], "data": {"a": {"sqlite": "a.db", "table": "t"}}})", "a.db a.db-wal job.json",
          "a database, whose last changes may come to a file of their own"},
-        {R"({"report": [], "data": {"a": {"csv": "-"}}})", "job.json", "standard input is no file"},
+        {R"({"report": [], "data": {"a": {"csv": "-"}}})", "job.json", "standard input is not a file"},
     };
     for (const Row &row : rows) {
         const JobFolder folder;

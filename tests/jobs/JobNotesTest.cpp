@@ -212,7 +212,7 @@ TEST(JobNotes, CompareVariablesAndNotTheirIdentifiers)
     QString notes = QString::fromStdString(notesOf(job));
     notes.remove(QRegularExpression(QStringLiteral("job\\.json:1:\\d+: note: ")));
     EXPECT_EQ(notes.toStdString(), "no column fills the field \"Elevation\" of the table \"Points\"")
-        << "the text of another variable is no number";
+        << "the text of another variable is not a number";
     job.folder.put("p.csv", "Code,Elevation\nx,\n,5\n");
     job.run(templateJob(R"("p": {"csv": "p.csv"})", tableStep));
     EXPECT_TRUE(job.text().startsWith(QStringLiteral("x    |    0.000\n"))) << job.text().toStdString();
@@ -222,7 +222,7 @@ TEST(JobNotes, CompareVariablesAndNotTheirIdentifiers)
         notes.toStdString(),
         "1 value of the field \"Elevation\" of the table \"Points\" is missing and shows as 0, in row 1, line 1 of "
         "the report")
-        << "a zero that nobody gave";
+        << "a zero that is not in the data";
 }
 
 TEST(JobNotes, NameTheVariableThatShowsInsteadOfAnother)

@@ -69,7 +69,7 @@ TEST(JobReaderError, OfPdfs)
 {
     constexpr Row rows[] = {
         {R"({"report": [], "pdf": @true})", "an object was expected", "wrong type"},
-        {R"({"report": [], "pdf": @null})", "an object was expected", "null is no object"},
+        {R"({"report": [], "pdf": @null})", "an object was expected", "null is not an object"},
         {R"({"report": [], "pdf": {@"autor": "A"}})", "did you mean \"author\"", "an unknown key, with the nearest"},
         {R"({"report": [], "pdf": {"title": @5}})", "a text was expected", "wrong type"},
         {R"({"report": [], "pdf": {"author": @null}})", "a text was expected", "wrong type"},

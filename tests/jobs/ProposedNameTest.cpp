@@ -54,7 +54,7 @@ TEST(ProposedName, IsBesideWhatTheReportIsMadeOf)
         {{title, QString(), QString(), last}, QStringLiteral("/last/Pegs.pdf"), "made of nothing"},
         {{title, QString(), QStringLiteral("/no/such/folder/list.json"), last},
          QStringLiteral("/last/Pegs.pdf"),
-         "nobody can write there"},
+         "the folder cannot be written to"},
         {{QString(), QString(), QString(), last}, QString(), "nothing is known"},
     };
     for (const Row &row : rows) {

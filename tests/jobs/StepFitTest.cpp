@@ -86,7 +86,7 @@ TEST(StepFit, ALabelIsMeasuredByTheFormat)
     }
 }
 
-/// A type with values of it as they stand in data.
+/// A type with values of it as they are in data.
 struct TypeRow
 {
     const char *type;

@@ -47,7 +47,7 @@ TEST(CommandLineCheck, SaysWhatIsPassedOverInSilence)
         {"<OutputList>\n<Field>", "<OutputList>\n<Field></Field><Field>", "t.xml:5:1: error: ", 2,
          "an empty element that ends its list"},
         {"<ReportTemplate><Name>SITE", "<ReportTemplate><Tables></Tables><Name>SITE", "t.xml:17:34: error: ", 2,
-         "a name behind the tables"},
+         "a name after the tables"},
         {"<Name>CONTROL</Name><Title>Control points</Title>\n", "\n", "t.xml:", 2, "no name of its own"},
         {"<Type>COORDINATE</Type>", "<Type>COORD</Type>", "t.xml:10:58: error: ", 2, "an unknown type"},
         {"<VariableName>Northing</VariableName><Label>", "<VariableName>Height</VariableName><Label>",

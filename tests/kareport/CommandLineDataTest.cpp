@@ -31,7 +31,7 @@ TEST(CommandLineData, TheShortFormReadsTextsOfEveryHabit)
         {"Number;Northing\n1;12.5\n2A;0\n", "--delimiter ;", "a delimiter"},
         {"Number\tNorthing\n1\t12.5\n2A\t0\n", "--delimiter tab", "a tab, which is hard to type"},
         {"Number Northing\n1 12.5\n2A 0\n", "--delimiter whitespace", "blanks"},
-        {"Number;Northing\n1;12.5\n2A;0\n", "--delimiter auto", "found out"},
+        {"Number;Northing\n1;12.5\n2A;0\n", "--delimiter auto", "detected"},
         {"1,12.5\n2A,0\n", "--no-header --order PN", "an order"},
         {"1,x,12.5\n2A,x,0\n", "--no-header --columns Number,-,Northing", "names by position"},
         {"Pt,H\n1,12.5\n2A,0\n", "--columns Number=Pt,Northing=2", "columns of variables"},

@@ -117,7 +117,7 @@ TEST(CommandLineWatch, ItMakesTheReportAtOnceAndOnEachChange)
     t.put("points.csv", "Number,Northing\n9,1\n");
     t.put("other.csv", "Number,Northing\n10,1\n");
     ASSERT_TRUE(t.waitFor(made, ++runs));
-    EXPECT_EQ(t.err.count(made), runs) << "what is no data of the job any more, and outputs, make no run\n"
+    EXPECT_EQ(t.err.count(made), runs) << "outputs, and files that are no longer data of the job, start no run\n"
                                        << t.err.constData();
     EXPECT_EQ(t.err.count(notMade), 0) << t.err.constData();
 }

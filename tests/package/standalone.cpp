@@ -1,4 +1,4 @@
-// A program without a main window: its reports stand alone on the desktop, and it ends with the last of them.
+// A program without a main window: its reports are windows on the desktop, and it ends with the last of them.
 #include <KaReport/COneViewPane.h>
 #include <KaReport/DefaultPrinter.h>
 #include <KaReport/Profile.h>

@@ -6,7 +6,7 @@
 
 using kareport::fixedPitchFont;
 using kareport::setFixedPitch;
-using kareport::standInFaces;
+using kareport::substituteFaces;
 
 namespace
 {
@@ -14,7 +14,7 @@ namespace
 TEST(FixedPitchFont, TheFaceThatIsWantedComesFirstAndTheStandInsFollow)
 {
     const QFont font = fixedPitchFont(QStringLiteral("No Such Face"));
-    EXPECT_EQ(font.families(), QStringList(QStringLiteral("No Such Face")) + standInFaces());
+    EXPECT_EQ(font.families(), QStringList(QStringLiteral("No Such Face")) + substituteFaces());
     EXPECT_TRUE(font.fixedPitch());
     EXPECT_EQ(font.styleHint(), QFont::TypeWriter);
     EXPECT_EQ(font.weight(), int(QFont::Normal));

@@ -126,7 +126,7 @@ TEST(PageHeader, SaysTheNumberOfItsPage)
         {front + QStringLiteral("123456789"), 123456789, "nine digits"},
         {front + QStringLiteral("1234567890"), std::nullopt, "too many"},
         {front, std::nullopt, "none"},
-        {QStringLiteral("12.5  7"), std::nullopt, "a line that is no header"},
+        {QStringLiteral("12.5  7"), std::nullopt, "a line that is not a header"},
         {QString(), std::nullopt, "an empty line"},
     };
     for (const Row &row : rows) {

@@ -73,7 +73,7 @@ TEST(ReportTextReplace, WhatIsNotInTheTextIsRefused)
     };
     constexpr Row rows[] = {
         {-1, 0, "before the text"},
-        {5, 0, "behind the text"},
+        {5, 0, "after the text"},
         {0, -1, "fewer than none"},
         {3, 2, "one character past the end"},
         {4, 1, "only the 0 is there"},

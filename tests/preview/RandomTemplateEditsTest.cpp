@@ -77,7 +77,7 @@ TEST(RandomTemplateEdits, EveryPageIsThatOfAFreshRun)
         if (preview.result.pages) {
             ++shown;
             const QString pages = preview.shown();
-            // A run that stops early does not see what is wrong with rows that nobody looks at.
+            // A run that stops early does not see what is wrong with rows that are not shown.
             const bool isSame = preview.result.pages->isWhole ? report == pages : report.startsWith(pages);
             ASSERT_TRUE(isSame) << "edit " << edit << "\n"
                                 << text.toStdString() << "\n"

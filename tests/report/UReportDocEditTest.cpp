@@ -25,7 +25,7 @@ TEST(UReportDocEdit, AReplacedPieceIsAModification)
         {1, 0, u"x", true, true, u"ax\r\nb", "inserted"},
         {1, 2, u"", true, true, u"ab", "a line end removed"},
         {0, 0, u"", true, false, u"a\r\nb", "nothing replaced by nothing"},
-        {4, 1, u"x", false, false, u"a\r\nb", "behind the text"},
+        {4, 1, u"x", false, false, u"a\r\nb", "after the text"},
         {-1, 1, u"x", false, false, u"a\r\nb", "before the text"},
     };
     for (const Row &row : rows) {

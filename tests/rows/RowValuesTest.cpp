@@ -103,7 +103,7 @@ TEST(RowFormula, GivesWholeNumbersOfThirtyTwoBits)
     EXPECT_EQ(std::get<qint32>(object.Find(target)->value()), 1'999'999'999);
     object.Set(2, qint32(2'000'000'000));
     formula.setValue(object);
-    EXPECT_EQ(object.Find(target), nullptr) << "too large is no value";
+    EXPECT_EQ(object.Find(target), nullptr) << "too large is not a value";
 }
 
 TEST(RowCondition, AsksOneValue)

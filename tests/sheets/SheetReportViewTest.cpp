@@ -40,7 +40,7 @@ TEST(SheetReportView, ShowsTextSheetsOrBoth)
     shown.show(Shows::Text);
     EXPECT_TRUE(shown.edit().isVisible());
     EXPECT_FALSE(shown.sheets().isVisible());
-    EXPECT_EQ(shown.view().sheets().layout(), nullptr) << "nothing is found for nobody";
+    EXPECT_EQ(shown.view().sheets().layout(), nullptr) << "nothing is found while nothing is shown";
 }
 
 TEST(SheetReportView, TheKeyboardIsWhereTheReportIsShown)

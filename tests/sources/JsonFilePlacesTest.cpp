@@ -7,7 +7,7 @@
 
 #include <gtest/gtest.h>
 
-// Where the values of a JSON file stand.
+// Where the values of a JSON file are.
 
 namespace
 {

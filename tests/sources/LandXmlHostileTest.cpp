@@ -171,7 +171,7 @@ TEST(LandXmlHostile, ElementsWithoutContentDoNotFillTheMemory)
                                                      QByteArray("<CrossSectPnt/>").repeated(100000) +
                                                      "</DesignCrossSectSurf></CrossSect></CrossSects>"))})
     {
-        // Of an alignment that is not asked for: there an empty element is no error in itself.
+        // Of an alignment that is not asked for: there an empty element is not an error in itself.
         LandXmlFile file(fileOf(content), queryOf(kind, kind == Kind::Points ? "" : "another"));
         EXPECT_EQ(file.rows(), QStringList());
         ASSERT_TRUE(file.list->error()) << keyOf(kind).toString().toStdString();

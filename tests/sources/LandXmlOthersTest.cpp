@@ -5,7 +5,7 @@
 
 #include <gtest/gtest.h>
 
-// What nobody asked for, what is only compared, and what a file leaves open.
+// What was not asked for, what is only compared, and what a file leaves open.
 
 namespace
 {
@@ -192,7 +192,7 @@ TEST(LandXmlOthers, ElementsThatNoListReadsAreCountedHoweverDeepTheyAre)
     EXPECT_EQ(notesOf(fileOf("<Project name='p'><Feature/></Project><Application><Author/></Application>"),
                       queryOf(Kind::Points)),
               QStringList())
-        << "what says who made the file is no data";
+        << "what says who made the file is not data";
 }
 
 TEST(LandXmlOthers, APointThatRefersToAnIdentifierOfItsOwnNameIsTheSamePoint)

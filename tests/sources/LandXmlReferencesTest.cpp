@@ -91,7 +91,7 @@ TEST(LandXmlReferences, PointsOfASurveyAreReadLikeOthers)
                                          u"SurveyHeader: 1 in the file, which no list reads"_qs}));
 }
 
-TEST(LandXmlReferences, APointThatNobodyRefersToMayBeWrong)
+TEST(LandXmlReferences, APointThatIsNotReferredToMayBeWrong)
 {
     const QByteArray spoiled = "\n<CgPoints name='other'><CgPoint name='p'>1,5 2</CgPoint>"
                                "<CgPoint name='alias' pntRef='p'/></CgPoints>";

@@ -89,7 +89,7 @@ TEST(LandXmlWidths, OfSeveralGradeSurfacesAreNotAddedTogether)
     EXPECT_EQ(file.rows(1).value(0), u"3.0|6.0"_qs) << "each side has those of the first surface that has some";
     EXPECT_EQ(file.notes(),
               QStringList(u"the alignment \"road\" has 2 more grade surfaces, whose widths are not listed"_qs))
-        << "which is no mistake of the file: it has no place";
+        << "which is not a mistake of the file: it has no place";
     LandXmlFile one(road(zones("left", "3"), "<GradeModel><GradeSurface alignmentRef='road'>" + zones("left", "4") +
                                                  "</GradeSurface></GradeModel>"),
                     queryOf(Kind::Stations), widths);

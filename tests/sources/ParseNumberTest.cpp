@@ -42,7 +42,7 @@ TEST(ParseNumber, ReadsWhatIsANumber)
         {"5e-324", 5e-324, "the smallest number"},
         {"1e-400", 0, "too small for a double is 0"},
         {"-1e-5000", 0, "too small for any type"},
-        {"1e-99999999999999999999", 0, "an exponent that is no number itself"},
+        {"1e-99999999999999999999", 0, "an exponent that is not a number itself"},
         {"INF", infinite, "infinite"},
         {"inf", infinite, "in small letters"},
         {"-INF", -infinite, "infinite below 0"},

@@ -173,7 +173,7 @@ TEST_F(PostgresServer, APasswordComesFromTheUser)
         server().guardedConnection(), QStringLiteral("SELECT current_user AS number"), {}, {}};
     const JobFolder folder;
     qputenv("PGPASSFILE", QFile::encodeName(folder.path("none")));
-    EXPECT_EQ(rowsOf(guarded), "error the server wants a password: it was expected in the user's own password file "
+    EXPECT_EQ(rowsOf(guarded), "error the server asks for a password: it was expected in the user's own password file "
                                "(~/.pgpass) or in PGPASSWORD");
     qputenv("PGPASSWORD", "open sesame");
     EXPECT_EQ(rowsOf(guarded), "number=guarded") << "from the environment";

@@ -74,7 +74,7 @@ TEST(SameRows, ComeFromEveryDialectAndSource)
         const auto file = fileOf(folder, survey::textOf(points, dialect));
         dialect.kind = DelimiterKind::Automatic;
         kareport::CsvObjectList list(file, dialect, survey::variables(), {});
-        expectRows(list, inTurn, sorted, std::string("found out: ") + delimiter);
+        expectRows(list, inTurn, sorted, std::string("detected: ") + delimiter);
     }
     for (const bool isList : {true, false}) {
         kareport::JsonFileList list(fileOf(folder, survey::jsonOf(points, isList)), {}, survey::variables(), {});

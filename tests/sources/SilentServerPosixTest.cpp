@@ -90,7 +90,7 @@ TEST_F(SilentServer, NeedNotBeWaitedFor)
     int calls = 0;
     PostgresObjectList list(query(), survey::variables(), [&calls](std::size_t) { return ++calls < 5; });
     EXPECT_EQ(list.GetAt(0), nullptr);
-    EXPECT_FALSE(list.error()) << "to be stopped is no mistake of the data";
+    EXPECT_FALSE(list.error()) << "to be stopped is not a mistake of the data";
     EXPECT_GE(calls, 5);
 }
 

@@ -381,7 +381,7 @@ void ReportModel::splice(const Change &change, const std::vector<qint64> &brough
         return std::find(offsets.begin(), offsets.end(), offset) != offsets.end();
     };
     const bool startedHere = has(change.before, 0);
-    const bool startedBehind = !change.removed.isEmpty() && has(change.before, change.removed.size());
+    const bool startedAfter = !change.removed.isEmpty() && has(change.before, change.removed.size());
     const auto first = cells_.begin() + change.at;
     cells_.erase(first, first + change.removed.size());
     std::vector<Cell> put;
@@ -401,7 +401,7 @@ void ReportModel::splice(const Change &change, const std::vector<qint64> &brough
         if (startedHere) {
             mark(change.at, true);
         }
-        if (startedBehind) {
+        if (startedAfter) {
             mark(end, true);
         }
     }

@@ -101,7 +101,7 @@ TEST(TemplateCheck, RemarksOnTags)
     }
 }
 
-TEST(TemplateCheck, RemarksOnWhatNobodyReads)
+TEST(TemplateCheck, RemarksOnWhatIsNotRead)
 {
     const char *const title = "<Title>Stakeout</Title>";
     const char *const align = "<Align>RIGHT</Align>";

@@ -214,7 +214,7 @@ TEST(CReportViewPane, WithoutAViewOfAReportItAlwaysCloses)
     auto *other = new CReportViewPane;
     addRecordingView(*other, held);
     other->OnSysCommand(scClose, 0);
-    EXPECT_FALSE(CViewPane::IsOpen(other)) << "only the report's own view is what the editor stands for";
+    EXPECT_FALSE(CViewPane::IsOpen(other)) << "the editor takes the place of the report's own view alone";
     EXPECT_TRUE(desk.messages.empty());
 }
 

@@ -189,7 +189,7 @@ TEST_F(ReportListTest, AnAddedLineLeavesTheCurrentOne)
     ASSERT_TRUE(shown());
     EXPECT_EQ(currentRow(), 3);
     list.WriteLine(u"written");
-    EXPECT_EQ(list.AddString(u"added behind it"), 52);
+    EXPECT_EQ(list.AddString(u"added after it"), 52);
     ASSERT_TRUE(shown());
     EXPECT_EQ(currentRow(), 51) << "the last that was written";
 }

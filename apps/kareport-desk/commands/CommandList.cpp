@@ -149,7 +149,7 @@ void CommandList::showReason()
 {
     const QTreeWidgetItem *item = list_->currentItem();
     if (item == nullptr) {
-        reason_->setText(Xlate("No command is called so."));
+        reason_->setText(Xlate("No command has this name."));
         return;
     }
     const QAction &action = *commands_[item->data(0, numberRole).toULongLong()].action;

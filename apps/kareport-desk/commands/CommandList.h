@@ -21,7 +21,7 @@ struct ListedCommand
     QString name; ///< with the names of the menus that lead to it: "File › Save As"
 };
 
-/// The commands of a menu bar, in its order. Entries that stand for a file or a window are none.
+/// The commands of a menu bar, in its order. Entries for files and windows are not commands.
 std::vector<ListedCommand> listedCommands(const QMenuBar &bar);
 
 /// All commands with their keys. What is typed narrows them; Enter runs the one that is selected. What cannot act now is grey

@@ -27,7 +27,7 @@ bool isOneOf(unsigned command, std::initializer_list<unsigned> commands)
     return std::find(commands.begin(), commands.end(), command) != commands.end();
 }
 
-/// Commands that stand in the menus always, with or without a report.
+/// Commands that are always in the menus, with or without a report.
 bool needsNoReport(unsigned command)
 {
     return isOneOf(command,

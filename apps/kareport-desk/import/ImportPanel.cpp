@@ -190,7 +190,7 @@ void ImportPanel::forgetUnknown()
     }
 }
 
-/// Begins with the file: with what was chosen for another one of its shape, or with what can be found out.
+/// Begins with the file: with what was chosen for another one of its shape, or with what can be detected.
 void ImportPanel::begin()
 {
     mapping_.clear();

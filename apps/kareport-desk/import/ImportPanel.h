@@ -27,7 +27,7 @@ namespace kareport
 /// variables of the columns and the units of the numbers; and shows the first rows as they are read then. What does not fit is
 /// red, and its tool tip says why. Of a SQLite database or a GeoPackage: the table, the variables of its columns and the units.
 ///
-/// A file begins with what was chosen for the last one of its shape, or else with what can be found out.
+/// A file begins with what was chosen for the last one of its shape, or else with what can be detected.
 class ImportPanel : public QGroupBox
 {
 public:
@@ -91,7 +91,7 @@ private:
     DataPreview own_; ///< without what was chosen for columns
     DataPreview preview_;
     bool isChosen_ = false;  ///< the user has chosen something since the file came
-    bool isFilling_ = false; ///< the lists are filled, and nobody chooses anything
+    bool isFilling_ = false; ///< the lists are being filled: what changes in them is not a choice
     std::function<void()> changed_;
 };
 

@@ -93,7 +93,7 @@ void ImportPanel::showRows()
     }
     table_->resizeColumnsToContents();
     for (int column = 0; column < table_->columnCount(); ++column) {
-        // A box in a cell is no content of its column.
+        // A box in a cell is not content of its column.
         if (const QWidget *box = table_->cellWidget(0, column)) {
             table_->setColumnWidth(column, std::max(table_->columnWidth(column), box->sizeHint().width()));
         }

@@ -18,7 +18,7 @@ QPalette readablePalette(const QPalette &palette);
 /// The colour of what is said less loudly, such as captions and places of files.
 QColor quietColor(const QPalette &palette, QPalette::ColorRole background = QPalette::Window);
 
-/// Makes a widget's text quiet. @param background  what it stands on
+/// Makes a widget's text quiet. @param background  what it is drawn on
 void makeQuiet(QWidget &widget, QPalette::ColorRole background = QPalette::Window);
 /// Gives a widget the one size of type that captions have.
 void makeCaption(QWidget &widget);

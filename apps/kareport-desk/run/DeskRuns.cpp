@@ -229,7 +229,7 @@ void DeskRuns::noteFailed(UReportDoc &report, const QString &error, Reason reaso
         AppMessageBox(error);
         return;
     }
-    // A file that is being written is seldom right: nobody has to answer for that.
+    // A file that is being written is seldom right: that is no reason for a message.
     notesPane().show();
     frame_.statusBar()->showMessage(Xlate("\"%1\" was not made again: %2").arg(report.GetTitle(), error));
 }
@@ -298,7 +298,7 @@ void DeskRuns::runChanged()
             runAgain(*report, Reason::FilesChanged);
         } else {
             frame_.statusBar()->showMessage(
-                Xlate("What \"%1\" is made of has changed. F5 makes it again.").arg(report->GetTitle()));
+                Xlate("Files of \"%1\" have changed. Press F5 to make it again.").arg(report->GetTitle()));
         }
     }
 }

@@ -84,7 +84,7 @@ private:
     enum class Reason
     {
         Asked,       ///< by the user: what goes wrong is said in a message
-        FilesChanged ///< what goes wrong is said where nobody has to answer
+        FilesChanged ///< what goes wrong is shown without a message that has to be answered
     };
     /// How a report was when its job had made it: what tells the user's own changes.
     using TextState = std::pair<quint64, qint64>;

@@ -113,7 +113,7 @@ void DeskRuns::showCount()
         made != nullptr ? std::ssize(made->notes.said()) + (made->problem.isEmpty() ? 0 : 1) : qsizetype(0);
     count_->setVisible(count > 0);
     count_->setText(count == 1 ? Xlate("1 note") : Xlate("%1 notes").arg(count));
-    count_->setToolTip(Xlate("Shows what there was to say when the report was made"));
+    count_->setToolTip(Xlate("Shows the notes on the report"));
 }
 
 /// Goes to what a note is about. @param isInFile  to its place in a file also where it has a line of the report

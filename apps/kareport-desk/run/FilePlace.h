@@ -19,7 +19,7 @@ struct FileLines
 };
 
 /// Reads the lines of a file around one of them: no more than a window needs, however long the file is.
-/// @return false when the file cannot be read, is no file, or has no such line
+/// @return false when the file cannot be read, is not a file, or has no such line
 bool readLinesAround(const QString &path, qsizetype line, FileLines &read);
 
 /// Shows a place in a file, for reading: in the window of its templates where it is a template, else among the lines around

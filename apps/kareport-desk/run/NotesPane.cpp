@@ -31,7 +31,7 @@ constexpr int numberRole = Qt::UserRole;   ///< of the note; −1 for the proble
 constexpr int lineRole = Qt::UserRole + 1; ///< whether it has a line of the report
 constexpr int fileRole = Qt::UserRole + 2; ///< whether it has a place in a file
 
-/// The place of a note as a short text: in the data where the value stands there, else that of what the note is about.
+/// The place of a note as a short text: in the data where the value is there, else that of what the note is about.
 QString placeText(const JobNote &note)
 {
     const bool isInData = note.dataPlace.has_value();

@@ -53,7 +53,7 @@ UReportView *openView(const ShownPlace &shown)
     return handle ? dynamic_cast<UReportView *>(*handle) : nullptr;
 }
 
-/// Where the views of a report are. None when nobody sees one of them: they load the report when they are shown.
+/// Where the views of a report are. None when none of them is shown: they load the report when they are shown.
 std::vector<ShownPlace> shownPlaces(const UReportDoc &report)
 {
     std::vector<ShownPlace> places;

@@ -10,7 +10,7 @@ namespace kareport
 
 class WrittenLines;
 
-/// A report that is made aside, to take the place of what another one holds.
+/// A hidden report that replaces what another one holds when it is complete.
 class WrittenReport
 {
 public:

@@ -55,7 +55,7 @@ public:
     PreviewWorker &operator=(const PreviewWorker &) = delete;
 
     void show(Request request);
-    /// Sets the data of what is shown next, read anew. A request has to follow.
+    /// Sets the data of what is shown next, which is read again. A request has to follow.
     void setData(Data data);
 
 private:

@@ -23,7 +23,7 @@ QString entryOf(const QString &templateFile)
     return dataEntry + QFileInfo(templateFile).absoluteFilePath();
 }
 
-/// The template file that a job names; empty for what is no job.
+/// The template file that a job names; empty for what is not a job.
 QString templateOf(const QFileInfo &job)
 {
     QFile file(job.filePath());

@@ -11,7 +11,7 @@
 namespace kareport
 {
 
-/// What the pages of a template are made with: a job or a data file; empty for rows that are made up.
+/// What the pages of a template are made with: a job or a data file; empty for sample rows.
 struct TemplateData
 {
     QString file;
@@ -30,7 +30,7 @@ struct TemplateData
 /// The jobs in the folder of a template that use it.
 QStringList jobsOfTemplate(const QString &templateFile);
 
-/// What was chosen for a template last; rows that are made up where it is gone.
+/// What was chosen for a template last; sample rows where it is gone.
 TemplateData rememberedData(const QString &templateFile);
 void rememberData(const QString &templateFile, const TemplateData &data);
 

@@ -29,7 +29,7 @@ TemplateFindBar::TemplateFindBar(TemplateTextEdit &edit, QWidget *parent)
     field_->setPlaceholderText(Xlate("Find"));
     constexpr int leastWidth = 120;
     field_->setMinimumWidth(leastWidth);
-    replacement_->setAccessibleName(Xlate("Text to put in its place"));
+    replacement_->setAccessibleName(Xlate("Replacement text"));
     replacement_->setPlaceholderText(Xlate("Replace with"));
     count_->setAccessibleName(Xlate("Matches"));
     const auto button = [this](const QString &text, auto act) {

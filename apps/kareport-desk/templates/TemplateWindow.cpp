@@ -132,7 +132,7 @@ void TemplateWindow::takeAnswer(PreviewWorker::Answer &answer)
         page_->setPages(*std::move(answer.result.pages));
     }
     if (answer.dataProblem) {
-        showMessage(Xlate("Rows that are made up are shown: %1").arg(answer.dataProblem->message()));
+        showMessage(Xlate("Sample rows are shown: %1").arg(answer.dataProblem->message()));
     } else if (answer.result.wrong) {
         showMessage(Xlate("The last pages that could be made are shown: %1").arg(answer.result.wrong->message()));
     } else {

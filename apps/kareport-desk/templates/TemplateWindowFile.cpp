@@ -166,7 +166,7 @@ void TemplateWindow::fillDataChoice()
         files.append(data_.file);
     }
     dataChoice_->clear();
-    dataChoice_->addItem(Xlate("Rows that are made up"));
+    dataChoice_->addItem(Xlate("Sample rows"));
     for (const QString &file : files) {
         dataChoice_->addItem(QFileInfo(file).fileName(), file);
     }

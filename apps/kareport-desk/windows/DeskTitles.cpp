@@ -46,7 +46,7 @@ void showTitles(QMainWindow &frame, const UDocument *inFront)
     }
     const QString program = Xlate(reportString(moduleTitle));
     QString name = inFront != nullptr ? nameOf(*inFront) : QString();
-    name.replace(QStringLiteral("[*]"), QStringLiteral("[*][*]")); // which would stand for the mark of changes
+    name.replace(QStringLiteral("[*]"), QStringLiteral("[*][*]")); // which is the mark of changes
     frame.setWindowTitle(name.isEmpty() ? program : name + QStringLiteral("[*] — ") + program);
     frame.setWindowModified(inFront != nullptr && inFront->IsModified());
 }

@@ -11,7 +11,7 @@ class UDocument;
 namespace kareport
 {
 
-/// The open reports at the end of a menu, with a mark at the one in front. It is made anew whenever the menu opens.
+/// The open reports at the end of a menu, with a mark at the one in front. It is filled again whenever the menu opens.
 class WindowList
 {
 public:
