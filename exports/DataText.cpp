@@ -25,7 +25,7 @@ std::ptrdiff_t lengthOf(double number)
     return std::to_chars(std::begin(text), std::end(text), number, std::chars_format::scientific).ptr - text;
 }
 
-/// A text with U+FFFD in the place of each half of a surrogate pair.
+/// A text with U+FFFD in place of each half of a surrogate pair.
 QString withoutHalves(QStringView text)
 {
     QString whole = text.toString();

@@ -18,7 +18,7 @@ namespace
 
 constexpr qsizetype mostDigits = 15; ///< that a number of a spreadsheet shows
 
-/// The function of SUBTOTAL that makes a total. It passes over totals that are made by it as well.
+/// The function of SUBTOTAL that makes a total. It skips totals that are made by it as well.
 int functionOf(ResultTotalKind kind)
 {
     switch (kind) {

@@ -69,7 +69,7 @@ bool ColumnComparison::isUnknown(const SourceColumn &column) const
            !variables_.contains(foldedKey(column.name));
 }
 
-/// The variable that shows in the place of another one: it is read, under the same identifier, and what it has is a number
+/// The variable that shows in place of another one: it is read, under the same identifier, and what it has is a number
 /// where a number is shown.
 QString ColumnComparison::shownInstead(const sXmlReportVariable &variable) const
 {

@@ -49,7 +49,7 @@ public:
 
     /// Makes a note an error: the report is not made then, and the notes so far are kept.
     void beStrict() { isStrict_ = true; }
-    /// Has it measured how the data of each step fits its table or block. Off unless somebody asks: it takes time.
+    /// Has it measured how the data of each step fits its table or block. Off by default: it takes time.
     void measure() { isMeasuring_ = true; }
     /// Says which outputs receive the values that are written. They must outlive the runs; null for none.
     void setResults(ResultOutputs *results) { results_ = results; }

@@ -75,7 +75,7 @@ constexpr struct
             {"from", uses::places},         {"atElements", uses::places},   {"stations", uses::places},
             {"offsets", uses::places}};
 
-/// Fails at a key that the list has no use for: a reader of the job would believe that it does something.
+/// Fails at a key that the list does not use: a reader of the job would believe that it does something.
 void expectKeysOf(const JsonNode &set, unsigned used, QStringView list)
 {
     for (const auto &row : keys) {

@@ -10,7 +10,7 @@ namespace kareport
 /// has it.
 inline constexpr char16_t pageMark = u'\uFDD0';
 
-/// The text with the number in the place of each run of page marks. A number with fewer digits than the run has marks has
+/// The text with the number in place of each run of page marks. A number with fewer digits than the run has marks has
 /// blanks before it, so that a column keeps its width.
 QString withPageNumber(QStringView text, int page);
 

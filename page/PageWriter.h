@@ -134,7 +134,7 @@ public:
     /// line stays open.
     void writeLine(QStringView text, int linesBefore, int linesAfter, int style);
     void writeLine(QLatin1StringView text, int linesBefore, int linesAfter, int style);
-    /// The same with the number of the page that the line is on in the place of the page marks, which are looked for in the
+    /// The same with the number of the page that the line is on in place of the page marks, which are looked for in the
     /// first `marked` characters.
     void writeNumberedLine(QStringView text, qsizetype marked, int linesBefore, int linesAfter, int style);
     /// Ends the page without looking at what is left of it, and begins the next one.

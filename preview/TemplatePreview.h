@@ -29,7 +29,7 @@ class PreviewReport : public UReportDoc
 {
 public:
     PreviewReport();
-    /// The title without a look at the windows, which number titles that are taken.
+    /// The title as it was set: windows would number one that is taken.
     void SetTitle(const QString &title) override;
 };
 
@@ -56,7 +56,7 @@ struct PreviewPages
     const PreviewCell *cellAt(qint64 at) const;
 };
 
-/// What came of a template's text.
+/// The pages and remarks of a template's text.
 struct PreviewResult
 {
     std::optional<PreviewPages> pages; ///< nothing where they could not be made

@@ -108,7 +108,7 @@ const PageSheet *PageSetupForm::chosenSheet() const
 void PageSetupForm::fillSheets()
 {
     const QString printer = setup_.printers.size() > 1 ? printer_->currentText() : setup_.printer;
-    // A printer's own sheet gives way to the next printer's; one that was chosen is kept where it can be.
+    // A printer's own sheet is replaced by the next printer's; one that was chosen is kept where it can be.
     const QSize wanted = sheets_.empty() ? setup_.sheet : setup().sheet;
     const QSignalBlocker blocker(paper_);
     paper_->clear();

@@ -25,7 +25,7 @@ public:
         bool beginsPage = false; ///< begins a page, unless it is at the top of one
         int before = 0;          ///< blank lines before it, but at the top of a page
         quint64 row = 0;         ///< of the table, from 1; 0 for another line
-        bool hasRemarks = false; ///< somebody waits for the line of the row in the report
+        bool hasRemarks = false; ///< the line of the row in the report is asked for
         int group = -1;          ///< it heads a group of this level, from 0, and is an entry of the outline
     };
     /// What the lines are told and asked while they are written.

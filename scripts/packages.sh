@@ -19,7 +19,7 @@ packages_build=(
     libsqlite3-dev          # SQLite databases and GeoPackages
     libxlsxwriter-dev       # workbooks
     libfontconfig-dev       # where the faces of a PDF are
-    libfreetype-dev         # what the glyphs of a PDF are put together from
+    libfreetype-dev         # what the glyphs of a PDF are composed of
     fonts-dejavu-core       # the fixed-pitch face that a page is measured with, and of a PDF
 )
 packages_test=(

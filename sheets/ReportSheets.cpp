@@ -15,9 +15,9 @@ namespace kareport
 namespace
 {
 
-/// So long the windows wait at most for the sheets.
+/// How long the windows wait for the sheets at most.
 constexpr int slice = 8; // milliseconds
-/// So often they show how many sheets are known.
+/// How often they show how many sheets are known.
 constexpr int publishInterval = 100;
 constexpr int restWhileLoading = 50;
 

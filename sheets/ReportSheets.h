@@ -38,7 +38,7 @@ public:
 
     /// The window that shows the sheets, made with the first call. Whoever puts it into a window owns it.
     SheetPane &pane();
-    /// Whether sheets are found at all: only while somebody looks at them.
+    /// Whether sheets are found at all: only while they are shown.
     void setActive(bool on);
     bool isActive() const { return isActive_; }
 
@@ -64,7 +64,7 @@ private:
     Surroundings surroundings_;
     QPointer<SheetPane> pane_;
     bool isActive_ = false;
-    bool hasShown_ = false; ///< whether all sheets have been shown since somebody looks at them
+    bool hasShown_ = false; ///< whether all sheets were known once since they are shown
     bool bringsCursor_ = false;
     QElapsedTimer sincePublished_;
     std::unique_ptr<SheetLayout> layout_;

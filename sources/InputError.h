@@ -19,7 +19,7 @@ struct InputError
 
     /// "file:line:column: error: text", without the parts that are not known.
     QString message() const;
-    /// The same with another word in the place of "error".
+    /// The same with another word in place of "error".
     QString messageAs(const QString &word) const;
 };
 

@@ -29,7 +29,7 @@ struct sigaction otherHandler;
 
 static_assert(std::atomic<std::uintptr_t>::is_always_lock_free);
 
-/// Puts zeros into the place of what can no longer be read, from the page at hand to the mapping's end.
+/// Replaces what can no longer be read by zeros, from the current page to the end of the mapping.
 bool replaceByZeros(Slot &slot, std::uintptr_t address)
 {
     const std::uintptr_t page = address - address % pageSize;

@@ -67,7 +67,7 @@ private:
     InputError noMemory_; ///< made while there is memory: copying it takes none
     std::array<RowBatch, 2> batches_;
     std::size_t used_ = 1;               ///< the batch that was handed out last
-    bool isAlone_ = false;               ///< no thread could be had
+    bool isAlone_ = false;               ///< no thread could be started
     std::counting_semaphore<3> free_{1}; // of the batches, and one that lets the thread go at the end
     std::counting_semaphore<2> ready_{0};
     std::jthread thread_;

@@ -1,5 +1,5 @@
 #!/usr/bin/env bash
-# Starts programs in a folder where somebody has put libraries of the names that they need, and expects that none of these
+# Starts programs in a folder with libraries of the names that they need, and expects that none of these
 # is loaded.
 #
 #   foreign-library-test.sh COMPILER PROGRAM...

@@ -11,7 +11,7 @@ namespace kareport
 namespace
 {
 
-/// A piece takes about so long: the window answers well before a user notices, and the overhead of a piece is small.
+/// How long a piece takes, about: the window answers well before a user notices, and the overhead of a piece is small.
 constexpr qint64 pieceTime = 15;       // milliseconds
 constexpr qint64 firstPiece = 100'000; // characters: more than any window shows
 constexpr qint64 shortestPiece = 20'000;

@@ -97,7 +97,7 @@ private:
     void updateStartPage();
     /// Opens files that were dropped: data is proposed for a new report.
     void openDropped(const QStringList &files);
-    /// Lets the report window of a job give way to the report, unless it is to be kept.
+    /// Replaces the report window of a job by the report, unless it is to be kept.
     void giveWay(UDocument *report);
     void keepReportWindow();
     void chooseCommand();

@@ -53,7 +53,7 @@ void forAllViews(Work work)
     }
 }
 
-/// Shows sheets so in the view in front, or the text alone where it shows them so already.
+/// Shows sheets in this way in the view in front, or the text alone where it already does.
 void toggle(const UXTPMDIFrameWnd &frame, Shows shows)
 {
     if (SheetReportView *view = viewIn(frame)) {

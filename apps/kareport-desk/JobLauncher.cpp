@@ -78,7 +78,7 @@ UReportDoc *makeReport(const Job &job, const JsonSource &source, QWidget *parent
         result.notes = runner.notes();
     } catch (const std::bad_alloc &) {
         endRichTextMode(report);
-        closeReport(report); // half a report counts as none
+        closeReport(report); // an incomplete report is discarded
         throw;
     }
     if (wrong) {

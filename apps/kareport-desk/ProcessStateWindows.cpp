@@ -14,7 +14,7 @@ bool isProcessRunning(qint64 process)
     if (handle == nullptr) {
         return GetLastError() == ERROR_ACCESS_DENIED; // another user's exists
     }
-    // What somebody still holds a handle of is found after its end.
+    // A process is found after its end as long as any program holds a handle of it.
     const bool isRunning = WaitForSingleObject(handle, 0) == WAIT_TIMEOUT;
     CloseHandle(handle);
     return isRunning;

@@ -13,7 +13,7 @@ namespace kareport
 namespace
 {
 
-/// The command that a file in the place of one was meant for; empty for another word.
+/// The command that a file in place of one was meant for; empty for another word.
 QString commandForFile(const QString &word)
 {
     constexpr std::pair<const char *, const char *> rows[] = {

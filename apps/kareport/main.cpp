@@ -150,7 +150,7 @@ int main(int argc, char **argv)
         auto [count, words] = kareport::ProgramArguments::of(argc, argv);
         return finish(runProgram(count, words));
     } catch (const std::bad_alloc &) {
-        // Without memory, no text can be put together either.
+        // Without memory, no text can be composed either.
         std::fputs("kareport: error: there is not enough memory for this input\n", stderr);
         return kareport::exitInput;
     }

@@ -20,7 +20,7 @@ public:
     FaceGlyphs(FaceGlyphs &&) noexcept;
     FaceGlyphs &operator=(FaceGlyphs &&) noexcept;
 
-    /// The glyphs that a glyph is put together from, and theirs, without the glyph itself: an accented letter is a letter and
+    /// The glyphs that a glyph is composed of, and theirs, without the glyph itself: an accented letter is a letter and
     /// an accent, and these may have parts of their own.
     std::vector<unsigned> partsOf(unsigned glyph) const;
     /// The ink of a glyph from its origin, in thousandths of the font size, y upwards: `top` is its lower edge. Empty for a

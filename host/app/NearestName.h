@@ -21,7 +21,7 @@ QString withQuestion(const QString &sentence, QStringView misspelt, const QStrin
 /// where there are no names.
 QString withExpected(const QString &sentence, QStringView misspelt, const QStringList &known);
 
-/// A text for a message, with an ellipsis in the place of what is beyond a number of characters. No character outside the basic
+/// A text for a message, with an ellipsis in place of what is beyond a number of characters. No character outside the basic
 /// plane is halved.
 QString shortened(const QString &text, qsizetype most);
 

@@ -13,7 +13,7 @@ namespace kareport
 /// replaced. @return false when there is something of that name, or no file can be made
 bool openPrivateFile(QFile &file);
 
-/// Puts an empty file that only the user can read into the place of a file or a link; what a link points to stays.
+/// Replaces a file or a link by an empty file that only the user can read; what a link points to stays.
 /// @return false when something of that name cannot be removed, or no file can be made
 bool makePrivateFile(const QString &path);
 

@@ -23,7 +23,7 @@ public:
     virtual ~ProfileStore();
     /// The value of an entry, or `fallback` when there is none.
     virtual QString read(const QString &section, const QString &entry, const QString &fallback) const = 0;
-    /// Stores an entry, in the place of an earlier value.
+    /// Stores an entry, in place of an earlier value.
     virtual void write(const QString &section, const QString &entry, const QString &value) = 0;
 };
 

@@ -32,7 +32,7 @@ public:
     /// Docks the pane in the main frame, or leaves it a window of its own where there is none.
     void SetPlace(CViewPane *parent, unsigned style, const QRect *rect) override;
     void UpdateTitle() override;
-    /// Whether the pane is open, be it as a tab that another is before.
+    /// Whether the pane is open, also as a tab that another one hides.
     bool IsVisible() const override;
     bool IsInFront() const override;
     /// Shows the pane and brings it to the front, or hides it.

@@ -27,7 +27,7 @@ public:
     const std::vector<std::unique_ptr<UDocTemplate>> &GetDocTemplates() const { return templates_; }
 
     /// The documents of all templates, those of a template together, in the order in which they were made. Throws
-    /// std::bad_alloc without memory: who closes them must not pass over one.
+    /// std::bad_alloc without memory: who closes them must not miss one.
     std::vector<UDocument *> GetDocuments() const;
     /// Whether a pointer is an open document; it may be stale.
     bool IsOpen(const void *document) const;

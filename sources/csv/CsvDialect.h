@@ -27,7 +27,7 @@ struct CsvDialect
     DelimiterKind kind = DelimiterKind::Character;
     char delimiter = ',';      ///< one ASCII character, for `DelimiterKind::Character`
     bool hasHeader = true;     ///< the first row names the columns
-    bool isHeaderSaid = false; ///< somebody who knows the file has said so: the row is not looked at for data
+    bool isHeaderSaid = false; ///< it was chosen by somebody who knows the file: the row is not checked for data
     QStringList names;         ///< of the columns by their position, empty for one that is skipped. Then names of a
                                ///< header row do not count, and every row has as many cells
     QString order;             ///< the columns in short form, such as "PNEZD"; empty for none. Names of a header

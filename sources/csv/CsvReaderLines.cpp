@@ -13,7 +13,7 @@ void CsvReader::skipLines()
     }
 }
 
-/// Passes over lines that are not rows. @return false when something is wrong with one
+/// Skips lines that are not rows. @return false when something is wrong with one
 bool CsvReader::passOverLines()
 {
     while (position_ < bytes_.size() && isPassedOver()) {
@@ -33,7 +33,7 @@ bool CsvReader::isPassedOver() const
     return layout_.passesBlankLines && (text == std::string_view::npos || bytes_[text] == '\n');
 }
 
-/// Passes over a line, whatever it holds, with its carriage returns before the line feed: some files have several. Where lines
+/// Skips a line, whatever it holds, with its carriage returns before the line feed: some files have several. Where lines
 /// end with a carriage return alone, it would be all that follows: that is an error as in a row. @return false then
 bool CsvReader::passOverLine()
 {
@@ -58,7 +58,7 @@ bool CsvReader::passOverLine()
 /// Blank lines at the end of the file are not rows.
 bool CsvReader::skipEmptyEnd()
 {
-    // What was looked over once is not looked over again for each of its lines.
+    // What was searched once is not searched again for each of its lines.
     if (position_ < blankFrom_ || position_ > blankEnd_) {
         const char *blank = layout_.whitespace ? " \t\r\n" : "\r\n";
         blankFrom_ = position_;

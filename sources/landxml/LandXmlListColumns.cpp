@@ -41,7 +41,7 @@ bool LandXmlList::storeNumber(const Column &column, double number, UDataObject &
     return text ? column.parser.store(text->toStdString(), object) : column.parser.storeNumber(number, object);
 }
 
-/// Stores the values of the row at hand. @return what is wrong with one
+/// Stores the values of the current row. @return what is wrong with one
 std::optional<InputError> LandXmlList::storeValues(UDataObject &object, const std::vector<unsigned> *onlyIds) const
 {
     for (const Column &column : columns_) {

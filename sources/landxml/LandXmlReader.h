@@ -12,7 +12,7 @@
 namespace kareport
 {
 
-/// What is wanted of a file. Anything else takes no memory, and next to no time.
+/// What is wanted of a file. Anything else takes no memory, and hardly any time.
 struct LandXmlWants
 {
     bool points = false;

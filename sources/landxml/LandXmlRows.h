@@ -64,9 +64,9 @@ public:
     /// Goes to a row by its number from 0, after all were gone through.
     virtual void goTo(std::size_t index) = 0;
 
-    /// A value of the row at hand, valid until the next one.
+    /// A value of the current row, valid until the next one.
     virtual LandXmlValue value(std::size_t variable) const = 0;
-    /// Where the row at hand comes from.
+    /// Where the current row comes from.
     virtual std::size_t byte() const = 0;
     /// The same of a row by its number from 0, after all were gone through; nothing where there is no such row.
     virtual std::optional<std::size_t> byteOf(std::size_t index) = 0;
@@ -110,7 +110,7 @@ protected:
     LandXmlNames gradeLines_; ///< of grade lines
     LandXmlNames surfaces_;   ///< of surfaces along and across alignments
     LandXmlNotes modelNotes_; ///< of what is read once
-    LandXmlNotes passNotes_;  ///< of the pass at hand, where rows are made while the file is read
+    LandXmlNotes passNotes_;  ///< of the current pass, where rows are made while the file is read
     std::size_t position_ = 0;
     std::optional<InputError> error_;
     bool isStopped_ = false;

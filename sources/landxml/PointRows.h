@@ -28,7 +28,7 @@ public:
     std::optional<std::size_t> byteOf(std::size_t index) override;
 
 protected:
-    /// Takes the point at hand. @return false when something is wrong with it
+    /// Takes the current point. @return false when something is wrong with it
     virtual bool take();
     /// Reads the file from its start.
     void startReading();
@@ -37,7 +37,7 @@ protected:
 
     bool isReaderHeard_ = true; ///< the notes of the reader are new: nothing has read the file before
     const LandXmlPoint *point_ = nullptr;
-    std::optional<LandXmlPointTable::Found> referred_; ///< the point that the one at hand refers to
+    std::optional<LandXmlPointTable::Found> referred_; ///< the point that the current one refers to
     PlanePoint at_;
     double height_ = notGiven;
 

@@ -31,7 +31,7 @@ private:
     const LandXmlRoute *route_ = nullptr; ///< null until the alignment is read, and when something is wrong with it
     std::optional<NearestFoot> nearest_;
     const VerticalProfile *profile_ = nullptr;
-    std::optional<AlignmentFoot> foot_; ///< of the point at hand; nothing where it has no place on the alignment
+    std::optional<AlignmentFoot> foot_; ///< of the current point; nothing where it has no place on the alignment
     std::optional<double> station_;
     std::optional<double> design_;
     std::string kind_;

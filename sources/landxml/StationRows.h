@@ -47,7 +47,7 @@ private:
     AlignmentModel model_;
     std::vector<Lines> lines_; ///< one for each route
     std::vector<Row> rows_;
-    std::size_t rowRoute_ = 0; ///< of the row at hand
+    std::size_t rowRoute_ = 0; ///< of the current row
     const LandXmlRoute *route_ = nullptr;
     double distance_ = 0;
     std::optional<CurvePlace> place_;

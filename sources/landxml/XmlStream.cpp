@@ -149,7 +149,7 @@ void XmlStream::started(const char *name, const char *const *attributes)
     }
 }
 
-/// Leaves out all that is in the element at hand. @param isTold  but for the names of its elements
+/// Leaves out all that is in the current element. @param isTold  but for the names of its elements
 void XmlStream::leaveOut(bool isTold, bool isForeign)
 {
     leftOutFrom_ = depth_;

@@ -36,7 +36,7 @@ public:
 
     /// The rows of a query that was made here; null when there is no answer, which `failure` explains.
     PostgresResult read(const char *sql);
-    /// Has a query prepared, in the place of the one before. @return the description of its columns and parameters; null when it is wrong
+    /// Has a query prepared, in place of the one before. @return the description of its columns and parameters; null when it is wrong
     PostgresResult prepare(const QString &query);
     /// Sends the query that was prepared, whose rows come one by one from `next`.
     bool send(const std::vector<std::optional<QByteArray>> &parameters);

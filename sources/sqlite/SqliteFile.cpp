@@ -79,7 +79,7 @@ std::string_view bytesOfText(sqlite3_stmt *statement, int column)
 {
     const auto *text = reinterpret_cast<const char *>(sqlite3_column_text(statement, column));
     if (text == nullptr) {
-        throw std::bad_alloc(); // there is a text, which could not be had
+        throw std::bad_alloc(); // there is a text, and no memory for it
     }
     return {text, static_cast<std::size_t>(sqlite3_column_bytes(statement, column))};
 }

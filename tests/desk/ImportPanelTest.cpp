@@ -295,7 +295,7 @@ TEST(ColumnMapping, SaysWhatIsChosenAsAJobReadsIt)
     mapping.clear();
     mapping.choose(0, QString());
     EXPECT_EQ(text(mapping, ordered, {{"order", "PN"}}), R"({"columns":["-","Northing"]})")
-        << "in the place of the order";
+        << "in place of the order";
     again.take({{"columns", QJsonObject{{"Number", "gone"}, {"Northing", 7}}}}, named);
     EXPECT_TRUE(again.isEmpty()) << "what is not there is left out";
 }

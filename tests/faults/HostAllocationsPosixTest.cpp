@@ -282,7 +282,7 @@ constexpr HostOperation operations[] = {
          return true;
      },
      nullptr, nullptr, true},
-    {"Set, in the place of a value",
+    {"Set, in place of a value",
      [](HostSubject &s) {
          s.dictionary.Set(7, QString(longName));
          return true;

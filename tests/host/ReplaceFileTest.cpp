@@ -120,7 +120,7 @@ TEST(ReplaceFile, ATargetThatCannotBeAFileIsRefusedWithTheReason)
         EXPECT_FALSE(replaceFile(
             folder.path(row.name), [&asked](QIODevice &) { return asked = true; }, &error))
             << row.reason;
-        EXPECT_FALSE(asked) << row.reason << ": nothing is written in vain";
+        EXPECT_FALSE(asked) << row.reason << ": nothing is written for nothing";
         EXPECT_FALSE(error.isEmpty()) << row.reason;
         EXPECT_EQ(folder.names(), QStringLiteral("folder report.rep")) << row.reason;
         EXPECT_EQ(folder.content(), "old content") << row.reason;

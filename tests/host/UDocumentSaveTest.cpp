@@ -45,7 +45,7 @@ TEST(UDocumentSave, StoresIntoItsFile)
 
     document.content = "x";
     EXPECT_TRUE(document.OnSaveDocument(path));
-    EXPECT_EQ(contentOf(path), "x") << "in the place of a longer one";
+    EXPECT_EQ(contentOf(path), "x") << "in place of a longer one";
     document.content = "";
     EXPECT_TRUE(document.OnSaveDocument(path));
     EXPECT_EQ(contentOf(path), "") << "an empty one";

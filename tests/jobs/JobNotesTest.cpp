@@ -101,7 +101,7 @@ TEST(JobNotes, SayWhichFieldsHaveNoVariable)
 {
     struct Row
     {
-        const char *field; ///< in the place of the field of Northing
+        const char *field; ///< in place of the field of Northing
         const char *expected;
         const char *reason;
     };

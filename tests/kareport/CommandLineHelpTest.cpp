@@ -48,7 +48,7 @@ TEST(CommandLineHelp, AWordThatIsNotKnownGetsTheNearest)
         {"job.json", "\"job.json\" is not a command: did you mean \"kareport render job.json\"?", "kareport", "a job"},
         {"t.xml", "\"t.xml\" is not a command: did you mean \"kareport check t.xml\"?", "kareport", "a template"},
         {"none.json", "\"none.json\" is not a command: one of", "kareport", "no file"},
-        {"help rendr", "\"rendr\" is not a command: one of render,", "kareport", "in the place of a command"},
+        {"help rendr", "\"rendr\" is not a command: one of render,", "kareport", "in place of a command"},
         {"", "a command was expected: render, watch,", "kareport", "nothing"},
         {"--hepl", "kareport has no option \"--hepl\": did you mean \"--help\"?", "kareport", "of the program"},
         {"render job.json --ouput=a.txt", "render has no option \"--ouput\": did you mean \"--output\"?",

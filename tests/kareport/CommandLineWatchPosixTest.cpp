@@ -155,7 +155,7 @@ TEST(CommandLineWatch, WhatIsWrongIsSaidAndTheOutputStays)
         EXPECT_TRUE(row.said == nullptr || t.err.contains(row.said)) << row.reason << "\n" << t.err.constData();
         EXPECT_EQ(t.bytesOf("out.txt"), jobText()) << row.reason;
         t.put(row.name, right);
-        ASSERT_TRUE(t.waitFor(made, 2)) << row.reason << ": it is mended\n" << t.err.constData();
+        ASSERT_TRUE(t.waitFor(made, 2)) << row.reason << ": it is right again\n" << t.err.constData();
     }
 }
 

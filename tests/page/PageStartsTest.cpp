@@ -119,7 +119,7 @@ TEST(PageStarts, TheInverseOfAnEditGivesThemBack)
         {0, 30, QStringLiteral("y\r\n1b.\r\n"), "with something alike in its place"},
         {5, 0, header(9), "a page where there was none"},
         {10, 0, header(9), "a page before another"},
-        {5, 10, header(9) + QStringLiteral("x\r\n") + header(10), "pages in the place of pages"},
+        {5, 10, header(9) + QStringLiteral("x\r\n") + header(10), "pages in place of pages"},
     };
     for (const Row &row : rows) {
         StartedText text(threePages, threeStarts);

@@ -222,7 +222,7 @@ TEST(ReportTextReplace, WithoutMemoryForUtf16AWiderCharacterIsRefused)
     EXPECT_FALSE(text.replace(0, 1, wide));
     EXPECT_TRUE(text.isNarrow());
     EXPECT_EQ(contentOf(text), u'y' + QString(19999, u'x'));
-    EXPECT_EQ(memory.largest, LimitedMemory::bytesFor(32000)) << "there was no more to be had";
+    EXPECT_EQ(memory.largest, LimitedMemory::bytesFor(32000)) << "there was no more memory";
 }
 
 /// What makes a text longer, and how it is then.

@@ -177,7 +177,7 @@ TEST(ReportText, AssigningReplacesTheTextAndLeavesItEmptyWithoutMemory)
     EXPECT_TRUE(text.view() == longer);
     EXPECT_TRUE(text.assign(QString()));
     EXPECT_EQ(text.size(), 0);
-    EXPECT_EQ(memory.lastBytes, LimitedMemory::wideBytesFor(64000)) << "the block that was asked for in vain";
+    EXPECT_EQ(memory.lastBytes, LimitedMemory::wideBytesFor(64000)) << "the block that was refused";
 }
 
 TEST(ReportText, MoreCharactersThanFitIntoALengthAreRefusedWithoutAllocating)
@@ -228,7 +228,7 @@ TEST(ReportText, WithLittleMemoryLeftItGrowsByWhatIsNeeded)
     ReportText text(LimitedMemory::reallocate);
     const QString whole = pattern(96000);
     ASSERT_TRUE(text.append(QStringView(whole).first(64000)));
-    EXPECT_TRUE(text.append(QStringView(whole).sliced(64000))) << "twice the memory is not to be had, three blocks are";
+    EXPECT_TRUE(text.append(QStringView(whole).sliced(64000))) << "there is no memory for twice the size, but for three blocks";
     EXPECT_TRUE(text.view() == whole);
     EXPECT_FALSE(text.append(u"x"));
     EXPECT_EQ(memory.largest, LimitedMemory::wideBytesFor(96000));
@@ -270,7 +270,7 @@ TEST(ReportText, ClearingWorksWithoutAnyMemory)
     memory.largest = 0;
     text.clear();
     EXPECT_EQ(text.size(), 0);
-    EXPECT_FALSE(text.isNarrow()) << "there is no other block to be had";
+    EXPECT_FALSE(text.isNarrow()) << "there is no memory for another block";
     EXPECT_TRUE(isZeroFrom(text, 0, 32000));
     EXPECT_TRUE(text.append(pattern(32000)));
     EXPECT_TRUE(text.view() == pattern(32000));

@@ -90,7 +90,7 @@ TEST(ReportContent, WhatBeginsAsRichTextIsShownAsSuch)
         UReportDoc report;
         report.SetData(row.text);
         EXPECT_EQ(showReportContent(report, document), std::nullopt) << row.reason;
-        EXPECT_EQ(document.toPlainText(), row.shown) << row.reason << ": in the place of what was there";
+        EXPECT_EQ(document.toPlainText(), row.shown) << row.reason << ": in place of what was there";
         EXPECT_EQ(textOf(report), row.text) << row.reason;
     }
 }

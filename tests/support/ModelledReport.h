@@ -75,12 +75,12 @@ private:
 
     /// A host opens the file that the report was saved in, which comes after what the report holds.
     void openSaved();
-    /// Saves as rich text, loads that in the place of the report, and looks at its pages. Then a user goes on with it, or the
+    /// Saves as rich text, loads that in place of the report, and looks at its pages. Then a user goes on with it, or the
     /// report's text is brought back.
     void reloadRichText(const ReportStep &step);
     /// A key in a view of rich text that was loaded, which may be undone.
     void typeIntoReloaded(Shown &shown, const ReportStep &step);
-    /// @return what is wrong with rich text that was loaded in the place of a text; empty when nothing is
+    /// @return what is wrong with rich text that was loaded in place of a text; empty when nothing is
     QString wrongWithRichText(const QString &before, const QStringList &pagesBefore);
 
     bool isAllCrLf() const;

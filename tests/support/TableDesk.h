@@ -13,7 +13,7 @@ public:
 
     /// The rows of a data file, with northings from a first one on.
     static QByteArray rows(int count, int first = 0);
-    /// Puts a file of rows in the place of the data.
+    /// Puts a file of rows in place of the data.
     void putRows(int count, int first = 0) const { folder.put("p.csv", rows(count, first)); }
     /// Opens the job, and its report in a view.
     UReportDoc *open(const char *job = "job.json");

@@ -83,7 +83,7 @@ TEST_F(ActivePane, WhateverBringsAPaneToTheFrontMakesItTheActiveOne)
          },
          0, "docked beside the others"},
         {[this] { QTest::mouseClick(editOf(*reports[1]).viewport(), Qt::LeftButton); }, 1, "pressed in"},
-        {[this] { pane(1).GetDock()->close(); }, 0, "that which is closed gives way"},
+        {[this] { pane(1).GetDock()->close(); }, 0, "the one that is closed is not active any more"},
     };
     for (const Row &row : rows) {
         row.act();

@@ -103,7 +103,7 @@ TEST(UReportViewFocus, AMousePressMakesAViewTheActiveOne)
     EXPECT_EQ(desk.frame.GetActiveView(), desk.views[1]);
     EXPECT_TRUE(desk.views[1]->GetEdit().hasFocus());
     QTest::mouseClick(desk.views[0]->GetEdit().viewport(), Qt::LeftButton);
-    EXPECT_EQ(desk.frame.GetActiveView(), desk.views[0]) << "in the place of the other";
+    EXPECT_EQ(desk.frame.GetActiveView(), desk.views[0]) << "in place of the other";
     EXPECT_TRUE(desk.views[0]->GetEdit().hasFocus());
 
     desk.views[1]->GetEdit().setFocus();

@@ -113,7 +113,7 @@ CommandList::CommandList(const std::vector<ListedCommand> &commands, QWidget *pa
                 item->setForeground(column, quietColor(palette(), QPalette::Base));
             }
             QFont slanted = font();
-            slanted.setItalic(true); // grey alone would not be seen by all
+            slanted.setItalic(true); // not everyone sees the gray
             item->setFont(0, slanted);
             item->setData(0, Qt::AccessibleDescriptionRole, action.statusTip());
             item->setToolTip(0, plainToolTip(action.statusTip()));

@@ -131,7 +131,7 @@ bool showFilePlace(QWidget *parent, const QString &path, const TextPlace &place)
     if (isTemplate(path)) {
         return openTemplateAt(path, place.line, place.column);
     }
-    // The one before gives way: a double click asks twice.
+    // It replaces the one before: a double click asks twice.
     for (QDialog *before : parent->findChildren<QDialog *>(filePlaceName)) {
         before->close();
     }

@@ -1,4 +1,4 @@
-// A host's own folders, preferences and messages, in the place of those of KaReportHost: nothing is kept and nothing is asked.
+// A host's own folders, preferences and messages, in place of those of KaReportHost: nothing is kept and nothing is asked.
 #include <KaReport/AppMessageBox.h>
 #include <KaReport/ApplicationTitle.h>
 #include <KaReport/Clock.h>

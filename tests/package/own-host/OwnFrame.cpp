@@ -1,4 +1,4 @@
-// A host's own documents, in the place of those of KaReportHost. It shows no windows: what would dock a pane is there and does
+// A host's own documents, in place of those of KaReportHost. It shows no windows: what would dock a pane is there and does
 // nothing.
 #include <KaReport/CPropertyPane.h>
 #include <KaReport/PlainWidgets.h>

@@ -1,4 +1,4 @@
-// A host's own job settings and data objects, in the place of those of KaReportHost: it keeps feet.
+// A host's own job settings and data objects, in place of those of KaReportHost: it keeps feet.
 #include "OwnHost.h"
 
 #include <KaReport/UDataObject.h>
