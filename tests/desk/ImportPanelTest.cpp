@@ -294,8 +294,7 @@ TEST(ColumnMapping, SaysWhatIsChosenAsAJobReadsIt)
     const auto ordered = columns({{"Number", "Number"}, {"Northing", "Northing"}});
     mapping.clear();
     mapping.choose(0, QString());
-    EXPECT_EQ(text(mapping, ordered, {{"order", "PN"}}), R"({"columns":["-","Northing"]})")
-        << "in place of the order";
+    EXPECT_EQ(text(mapping, ordered, {{"order", "PN"}}), R"({"columns":["-","Northing"]})") << "in place of the order";
     again.take({{"columns", QJsonObject{{"Number", "gone"}, {"Northing", 7}}}}, named);
     EXPECT_TRUE(again.isEmpty()) << "what is not there is left out";
 }

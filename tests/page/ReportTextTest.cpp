@@ -228,7 +228,8 @@ TEST(ReportText, WithLittleMemoryLeftItGrowsByWhatIsNeeded)
     ReportText text(LimitedMemory::reallocate);
     const QString whole = pattern(96000);
     ASSERT_TRUE(text.append(QStringView(whole).first(64000)));
-    EXPECT_TRUE(text.append(QStringView(whole).sliced(64000))) << "there is no memory for twice the size, but for three blocks";
+    EXPECT_TRUE(text.append(QStringView(whole).sliced(64000)))
+        << "there is no memory for twice the size, but for three blocks";
     EXPECT_TRUE(text.view() == whole);
     EXPECT_FALSE(text.append(u"x"));
     EXPECT_EQ(memory.largest, LimitedMemory::wideBytesFor(96000));
