@@ -92,6 +92,7 @@ packages_windows=(
 )
 packages_tidy=(
     clang clang-tidy        # the sources read for mistakes that compile
+    libclang-dev            # the plugin that keeps its checks out of the headers of the system
 )
 packages_coverage=(
     gcovr                   # which lines the tests reach

@@ -3,9 +3,9 @@
 
     scripts/tidy.py --jobs N FOLDER...
 
-Nearly all of the time goes into the headers of Qt and of the standard library, which clang-tidy walks through for each file.
-So sources that are compiled with the same options are read several at a time, in a file that includes them. What is found
-in such a file is looked for again in each source that it names alone, and said as it is there.
+Most of the time goes into the headers of Qt and of the standard library. So a plugin (tidy-scope.cpp) keeps the checks out of
+them, and sources that are compiled with the same options are read several at a time, in a file that includes them. What is
+found in such a file is looked for again in each source that it names alone, and said as it is there.
 
 A source that was found clean is not read again while it, the headers of the project that it includes, its options, clang-tidy
 and the installed headers stay the same. So a run that was stopped goes on where it was. Exit status 1 when something was found.
@@ -19,6 +19,7 @@ import os
 import pathlib
 import re
 import shlex
+import shutil
 import subprocess
 import sys
 
@@ -147,7 +148,18 @@ def batches_of(sources):
     return batches
 
 
-def read(sources):
+def made_plugin():
+    """@return the plugin that keeps the checks out of the headers of the system"""
+    source = ROOT / "scripts/tidy-scope.cpp"
+    made = BUILD / f"scope-{hash_of(str(source))[:16]}.so"
+    if not made.exists():
+        headers = pathlib.Path(os.path.realpath(shutil.which("clang-tidy"))).parent.parent / "include"
+        subprocess.run(["clang++", "-std=c++17", "-O1", "-fPIC", "-fno-rtti", "-shared", "-isystem", str(headers), str(source),
+                        "-o", str(made)], check=True)
+    return made
+
+
+def read(sources, plugin):
     """@return what clang-tidy says of sources that are read together; empty when it finds nothing"""
     path = sources[0].path
     if len(sources) > 1:
@@ -156,7 +168,7 @@ def read(sources):
         folder.mkdir(exist_ok=True)
         path = folder / (hashlib.sha256(text.encode()).hexdigest()[:16] + ".cpp")
         path.write_text(text)
-    run = subprocess.run(["clang-tidy", "--quiet", "--warnings-as-errors=*", str(path), "--", *sources[0].options],
+    run = subprocess.run(["clang-tidy", f"--load={plugin}", "--quiet", "--warnings-as-errors=*", str(path), "--", *sources[0].options],
                          cwd=sources[0].directory, capture_output=True, text=True, check=False)
     if len(sources) > 1:
         path.unlink()
@@ -167,9 +179,9 @@ def read(sources):
     return run.stdout + "\n".join(errors) or f"{path}: clang-tidy ended with {run.returncode}"
 
 
-def check(sources, tools):
+def check(sources, tools, plugin):
     """@return what is found in sources that are read together; empty when nothing"""
-    said = read(sources)
+    said = read(sources, plugin)
     if not said:
         for source in sources:
             (CLEAN / source.key(tools)).touch()
@@ -186,7 +198,7 @@ def check(sources, tools):
         alone = sources
     rest = [source for source in sources if source not in alone]
     groups = [[source] for source in alone] + ([rest] if rest else [])
-    return "".join(check(group, tools) for group in groups)
+    return "".join(check(group, tools, plugin) for group in groups)
 
 
 def main():
@@ -198,6 +210,8 @@ def main():
     tools = "".join(subprocess.run(command, capture_output=True, text=True, check=True).stdout
                     for command in (["clang-tidy", "--version"], ["dpkg-query", "-W", "*-dev"]))
     tools += (ROOT / ".clang-tidy").read_text()
+    plugin = made_plugin()
+    tools += plugin.name
     entries = add_example(BUILD / "compile_commands.json")
     batches = []
     for folder in options.folders:
@@ -208,7 +222,7 @@ def main():
         batches += batches_of(unread)
     status = 0
     with concurrent.futures.ThreadPoolExecutor(options.jobs) as pool:
-        waiting = {pool.submit(check, batch, tools): batch for batch in batches}
+        waiting = {pool.submit(check, batch, tools, plugin): batch for batch in batches}
         for number, done in enumerate(concurrent.futures.as_completed(waiting), 1):
             first = os.path.relpath(waiting[done][0].path, ROOT)
             print(f"clang-tidy: {number} of {len(batches)}: {first} and {len(waiting[done]) - 1} more", flush=True)
