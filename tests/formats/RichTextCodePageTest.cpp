@@ -3,7 +3,6 @@
 using richtext::body;
 using richtext::expectBodies;
 using richtext::Row;
-using richtext::shown;
 
 namespace
 {

@@ -1,6 +1,5 @@
 #include "RichTextDescription.h"
 
-using richtext::body;
 using richtext::expectBodies;
 using richtext::Row;
 using richtext::shown;

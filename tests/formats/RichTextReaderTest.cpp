@@ -7,7 +7,6 @@
 
 #include <random>
 
-using richtext::body;
 using richtext::expectBodies;
 using richtext::Row;
 using richtext::shown;

@@ -7,7 +7,6 @@
 namespace
 {
 
-using kareport::StationEquation;
 using kareport::Stationing;
 
 /// A gap (100 becomes 200), then an overlap (250 becomes 150), then a count that falls.

@@ -5,7 +5,6 @@
 namespace
 {
 
-using jobs::fiveRows;
 using jobs::run;
 using jobs::TestJob;
 

@@ -9,7 +9,6 @@ namespace
 
 using kareport::fitPage;
 using kareport::PageFit;
-using kareport::PageText;
 using kareport::SheetRoom;
 
 // Type of 8 points on a printer of 600 dots an inch: a row is 78 dots high, a character 40 dots wide.

@@ -12,7 +12,6 @@ namespace
 
 using kareport::PrintSheet;
 using kareport::ReportPage;
-using testing::ElementsAre;
 
 /// Pages of so many lines each, where every line has as many characters, its end included.
 std::vector<ReportPage> pagesOf(std::vector<qint64> lines, qint64 characters)

@@ -16,7 +16,6 @@
 namespace
 {
 
-using kareport::CsvObjectList;
 using kareport::FileBytes;
 
 /// Rows of 2 MB: enough for a file that is mapped.

@@ -7,7 +7,6 @@
 
 using markup::element;
 using markup::field;
-using markup::joined;
 
 namespace
 {
