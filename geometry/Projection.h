@@ -38,7 +38,7 @@ std::optional<AlignmentFoot> nearestFoot(const Alignment &alignment, PlanePoint 
 class NearestFoot
 {
 public:
-    /// @param alignment  must live as long, without a change
+    /// @param alignment  must outlive this object, unchanged
     explicit NearestFoot(const Alignment &alignment);
 
     std::optional<AlignmentFoot> of(PlanePoint point) const;

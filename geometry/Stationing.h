@@ -44,7 +44,7 @@ public:
     /// The place that a station names in a region; the region's borders belong to it. It may be outside the region: then the
     /// station names no place of it.
     double internalIn(std::size_t region, double station) const;
-    /// All places that a station names, in turn, up to an end of the alignment. A place on an equation whose two names
+    /// All places that a station names, in order, up to an end of the alignment. A place on an equation whose two names
     /// are equal is there once.
     std::vector<double> placesOf(double station, double endInternal) const;
     /// The equation that a place is on, or null.

@@ -76,7 +76,7 @@ public:
     std::optional<double> heightAt(double station) const;
     /// The grade at a station; nothing outside the profile. @param before  at a break, the grade that leads to it
     std::optional<double> gradeAt(double station, bool before = false) const;
-    /// The high and low points between two stations, in turn: where the grade changes its sign. A level stretch is reported by
+    /// The high and low points between two stations, in order: where the grade changes its sign. A level stretch is reported by
     /// neither of its ends.
     std::vector<ProfileExtreme> extremes(double from, double to) const;
     /// The horizontal length over which a parabola of equal lengths in and out changes the grade by one percent; nothing

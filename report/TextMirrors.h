@@ -15,7 +15,7 @@ class ReportWindow;
 class TextMirrors : public PageWriterObserver
 {
 public:
-    /// The document must live as long as this.
+    /// The document must outlive this object.
     explicit TextMirrors(UDocument &document) : document_(document) {}
 
     RichTextImage image;

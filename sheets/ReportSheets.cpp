@@ -87,7 +87,7 @@ SheetLayout *ReportSheets::layout()
     if (!isActive_ || isCurrent()) {
         return isActive_ ? layout_.get() : nullptr;
     }
-    timer_.start(); // another text: it is looked at as soon as it is there
+    timer_.start(); // another text: it is looked at when it is complete
     return nullptr;
 }
 

@@ -33,7 +33,7 @@ struct ValuePlace
     std::optional<TextPlace> place = std::nullopt; ///< that of the row where it has no value; nothing for a database
 };
 
-/// The rows of a data source as data objects, made while they are asked for in turn. When something is wrong with a row, or
+/// The rows of a data source as data objects, made while they are asked for in order. When something is wrong with a row, or
 /// reading is stopped, the list ends there.
 class RowList : public UDataObjectList
 {

@@ -21,7 +21,7 @@ namespace kareport
 class LandXmlChoice
 {
 public:
-    /// Adds the rows at the end of a form, which owns their widgets and must live as long.
+    /// Adds the rows at the end of a form, which owns their widgets and must outlive this object.
     explicit LandXmlChoice(QFormLayout &form);
     LandXmlChoice(const LandXmlChoice &) = delete;
     LandXmlChoice &operator=(const LandXmlChoice &) = delete;

@@ -21,7 +21,7 @@ namespace kareport
 class ImportPanel;
 
 /// Asks for a template file, one of its templates, a table or block of it, and the data file to write through it: a text file
-/// with how it is read, or LandXML with what is listed of it. What was chosen last time is there again, for a text file what
+/// with how it is read, or LandXML with what is listed of it. What was chosen last time is offered again, for a text file what
 /// was chosen for one of the same shape.
 class TemplateDialog : public QDialog
 {

@@ -26,7 +26,7 @@ struct PdfPlace
 class PdfPlaces
 {
 public:
-    /// @param entries  in the order of their places; must live as long as this
+    /// @param entries  in the order of their places; must outlive this object
     explicit PdfPlaces(const std::vector<OutlineEntry> &entries) : entries_(entries) {}
 
     /// The next line of a page. @param end  of it in the text. @param piece  its first one, from 0 on each page

@@ -5,7 +5,7 @@
 namespace kareport
 {
 
-/// The sides of parcels in turn, as a deed walks round them.
+/// The sides of parcels in order, as a deed walks round them.
 class CourseRows : public BorderRows
 {
 public:

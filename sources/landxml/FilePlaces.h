@@ -9,7 +9,7 @@ namespace kareport
 {
 
 /// Finds the places of bytes of an XML file. It is in UTF-16 where it begins with a byte-order mark, and otherwise in UTF-8 or
-/// in the encoding that it declares, whose characters are one byte each. Bytes that are asked for in turn cost one pass through
+/// in the encoding that it declares, whose characters are one byte each. Bytes that are asked for in order cost one pass through
 /// the file, and the file is not in memory as a whole afterwards.
 class FilePlaces
 {

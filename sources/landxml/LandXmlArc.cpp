@@ -36,8 +36,8 @@ std::variant<PlanePoint, LandXmlFault> centreOfCurve(const LandXmlElement &eleme
     return *centre;
 }
 
-/// The arc of the stated radius between the ends. About half a circle, the digits of the ends say next to nothing of how far it
-/// turns: what the file says besides does, where it leads to the end.
+/// The arc of the stated radius between the ends. About half a circle, the digits of the ends hardly say how far it turns:
+/// the other values of the file do, where they lead to the end.
 FittedCurve arcOfRadius(const LandXmlElement &element, const LandXmlEnds &ends, bool isRight, double tolerance)
 {
     const double radius = element.radius;

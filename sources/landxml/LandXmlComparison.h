@@ -22,7 +22,7 @@ struct LandXmlTolerance
 class LandXmlComparison
 {
 public:
-    /// @param notes  must live as long
+    /// @param notes  must outlive this object
     LandXmlComparison(const LandXmlUnits &units, const LandXmlTolerance &tolerance, LandXmlNotes &notes)
         : units_(units), tolerance_(tolerance), notes_(notes)
     {}

@@ -16,7 +16,7 @@
 namespace kareport
 {
 
-/// The rows of a LandXML file as data objects, made while they are asked for in turn: only a few objects exist at a time,
+/// The rows of a LandXML file as data objects, made while they are asked for in order: only a few objects exist at a time,
 /// and a list of points does not keep the file in memory either. Progress counts bytes.
 class LandXmlList : public RowList
 {

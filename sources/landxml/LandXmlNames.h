@@ -12,8 +12,8 @@
 namespace kareport
 {
 
-/// A name that a query asks for, while the names of a file go by. A name that is misspelt would otherwise give a list without
-/// rows, and without a reason.
+/// A name that a query asks for, compared with the names of a file as they are read. A misspelt name would otherwise give a
+/// list without rows, and without a reason.
 class LandXmlNames
 {
 public:
@@ -32,7 +32,7 @@ public:
 
     /// Whether a name of the file is wanted.
     bool matches(const std::string &name);
-    /// What is wrong when all names went by and none was the one.
+    /// What is wrong when none of all names was the one that is wanted.
     /// @param path  of the file
     std::optional<InputError> error(const QString &path) const;
 

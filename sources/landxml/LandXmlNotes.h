@@ -12,8 +12,8 @@
 namespace kareport
 {
 
-/// What a reader has to say of a file whose rows are sound: differences, and what is not read. Bounded, whatever the file
-/// holds.
+/// The notes of a reader on a file whose rows are sound: differences, and what is not read. Their number is bounded,
+/// whatever the file holds.
 class LandXmlNotes
 {
 public:

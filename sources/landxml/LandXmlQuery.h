@@ -17,7 +17,7 @@ enum class LandXmlListKind
     Points,        ///< coordinate geometry points
     SurfacePoints, ///< points of the surfaces' definitions
     Parcels,
-    Courses, ///< the sides of the parcels, in turn
+    Courses, ///< the sides of the parcels, in order
     Alignments,
     Elements,      ///< of the alignments' horizontal geometry, as they are stored
     Stations,      ///< places along the alignments, with points beside them

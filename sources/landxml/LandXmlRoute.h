@@ -51,7 +51,7 @@ struct LandXmlRoute
 std::optional<double> heightOn(const LandXmlHeightLine &line, double station);
 
 /// Makes the geometry of alignments whose references are resolved, and notes what does not fit together. @return one for
-/// each. They refer to the alignments, which must live as long
+/// each. They refer to the alignments, which must outlive them
 std::vector<LandXmlRoute> routesOf(const std::vector<const LandXmlAlignment *> &alignments,
                                    LandXmlComparison &comparison, LandXmlNotes &notes);
 

@@ -16,7 +16,7 @@ namespace kareport
 class LandXmlWidths
 {
 public:
-    /// Adds a zone, unless there are more than a road has: a place would have to look at each of them.
+    /// Adds a zone, unless there are more than a road has: each of them has to be looked at for a place.
     /// @param notes  receives widths that are not whole
     /// @return whether it was added
     bool add(const LandXmlZone &stored, LandXmlNotes &notes);

@@ -14,7 +14,7 @@ class SeenHashes
 public:
     /// Adds a hash. @return whether it is new
     bool add(std::uint64_t hash);
-    /// Has the memory fetched that a hash will need, which takes longer than anything else about it.
+    /// Prefetches the memory that a hash will need: waiting for it takes longer than anything else.
     void prepare(std::uint64_t hash) const
     {
         if (!places_.empty()) {

@@ -8,7 +8,7 @@
 namespace kareport
 {
 
-/// Takes places in turn, and makes those that are one place one.
+/// Takes places in order, and joins those that are one place.
 class StationPlaces::Merged
 {
 public:
@@ -58,7 +58,7 @@ std::optional<std::vector<double>> StationPlaces::of(const LandXmlRoute &route, 
     return merged.take();
 }
 
-/// The places but for those of the interval, in turn.
+/// The places but for those of the interval, in order.
 std::vector<StationPlaces::Place> StationPlaces::chosen(const LandXmlRoute &route) const
 {
     std::vector<Place> places;
@@ -94,7 +94,7 @@ void StationPlaces::addListed(const LandXmlRoute &route, std::vector<Place> &pla
     }
 }
 
-/// The places that the interval gives, in turn.
+/// The places that the interval gives, in order.
 std::optional<std::vector<double>> StationPlaces::regular(const LandXmlRoute &route, double most) const
 {
     std::vector<double> distances;

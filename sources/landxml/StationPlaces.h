@@ -25,7 +25,7 @@ public:
         : query_(query), unit_(unit), notes_(notes)
     {}
 
-    /// The distances of the places from the start of the alignment, in turn. Of places that are one, that of an equation
+    /// The distances of the places from the start of the alignment, in order. Of places that are one, that of an equation
     /// counts most, then that of a listed station, then the border of elements.
     /// @param most  places at most. @return nothing where the interval gives more
     std::optional<std::vector<double>> of(const LandXmlRoute &route, std::size_t most) const;

@@ -6,7 +6,7 @@
 #include <algorithm>
 #include <string>
 
-// Which places along alignments are listed, and what there is to say of them.
+// Which places along alignments are listed, and the notes on them.
 
 namespace kareport
 {

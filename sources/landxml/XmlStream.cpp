@@ -96,7 +96,7 @@ bool XmlStream::readSome()
         failParsing();
         return false;
     }
-    // A tag that does not end is looked through again with every block.
+    // A tag that does not end is searched again with every block.
     if (!isLast && position_ - currentByte() > longestTag) {
         error_ = InputError{file_->path(), FilePlaces(*file_).of(currentByte()),
                             Xlate("the tag has more than %1 bytes").arg(longestTag)};

@@ -23,7 +23,7 @@ namespace kareport
 class XmlAttributes
 {
 public:
-    /// @param pairs  names and values in turn, with a null at the end
+    /// @param pairs  names and values in order, with a null at the end
     explicit XmlAttributes(const char *const *pairs) : pairs_(pairs) {}
 
     /// The value of an attribute; nothing where the element has none of the name. Names with a prefix are found with it.

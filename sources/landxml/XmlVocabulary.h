@@ -16,7 +16,7 @@ class XmlVocabulary
 {
 public:
     /// Takes the declarations of an element that begins.
-    /// @param pairs  names and values of its attributes in turn, with a null at the end
+    /// @param pairs  names and values of its attributes in order, with a null at the end
     /// @param depth  of the element, 1 for the outermost one
     void begin(std::string_view name, const char *const *pairs, int depth);
     /// Ends the declarations of the element of a depth.
@@ -49,7 +49,7 @@ private:
     std::string rootPrefix_;
     Prefixes prefixes_;
     const Declarations *root_ = nullptr; ///< those of the outermost element's prefix, which most elements have
-    std::vector<Open> open_;             ///< all declarations that hold, in turn
+    std::vector<Open> open_;             ///< all declarations that hold, in order
 };
 
 } // namespace kareport

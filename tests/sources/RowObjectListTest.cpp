@@ -23,7 +23,7 @@ constexpr unsigned wholeId = 3;
 constexpr unsigned flagId = 4;
 constexpr unsigned pointId = 5;
 
-/// Rows that can be read in turn only, as those of a database.
+/// Rows that can be read in order only, as those of a database.
 class StreamedRows : public RowReader
 {
 public:

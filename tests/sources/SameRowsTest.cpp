@@ -24,7 +24,7 @@ std::shared_ptr<const kareport::FileBytes> fileOf(const JobFolder &folder, const
     return std::get<std::shared_ptr<const kareport::FileBytes>>(kareport::FileBytes::open(folder.path("points")));
 }
 
-/// Compares the rows of a list with the expected ones: in turn, again, and sorted.
+/// Compares the rows of a list with the expected ones: in order, again, and sorted.
 void expectRows(RowObjectList &list, const QStringList &inTurn, const QStringList &sorted, const std::string &reason)
 {
     EXPECT_EQ(survey::rowsOf(list), inTurn) << reason;

@@ -23,7 +23,7 @@ namespace
 
 constexpr int numberRole = Qt::UserRole;
 
-/// The text of a menu entry as it is read: without the marks of its key and the dots of what asks on.
+/// The text of a menu entry as it is read: without the marks of its key and the dots at its end.
 QString readText(const QAction &action)
 {
     QString text = action.text();

@@ -15,7 +15,7 @@ QColor readableOn(const QColor &text, const QColor &background);
 /// A palette in which every text has enough contrast on what it is written on. Colours that have it already stay.
 QPalette readablePalette(const QPalette &palette);
 
-/// The colour of what is said less loudly, such as captions and places of files.
+/// The colour of less important texts, such as captions and places of files.
 QColor quietColor(const QPalette &palette, QPalette::ColorRole background = QPalette::Window);
 
 /// Makes a widget's text quiet. @param background  what it is drawn on

@@ -32,10 +32,10 @@ struct LaunchHooks;
 struct LaunchResult;
 struct ReportMenu;
 
-/// The reports of the desk that jobs made: what each was made of, what there was to say of it, and how it is made again,
+/// The reports of the desk that jobs made: what each was made of, the notes on it, and how it is made again,
 /// because the user asks for it, chooses other units, or has said that it follows its files.
 ///
-/// Changes that were made by hand are given up only after a question. A run that fails leaves the report as it is.
+/// Changes that were made by hand are discarded only after a question. A run that fails leaves the report as it is.
 class DeskRuns : public QObject
 {
 public:
@@ -55,7 +55,7 @@ public:
     const ReportRecipe *recipeInFront() const;
     /// The same of any report.
     const ReportRecipe *recipeOf(const UDocument *report) const;
-    /// What there is to say of a report; null for one that no job made.
+    /// The notes on a report; null for one that no job made.
     const JobNotes *notesOf(const UDocument *report) const;
     /// The report has been closed.
     void forget(const UDocument *report);
@@ -86,7 +86,7 @@ private:
         Asked,       ///< by the user: what goes wrong is said in a message
         FilesChanged ///< what goes wrong is shown without a message that has to be answered
     };
-    /// How a report was when its job had made it: what tells the user's own changes.
+    /// How a report was when its job had made it: by which the user's own changes are known.
     using TextState = std::pair<quint64, qint64>;
 
     struct Made

@@ -32,11 +32,11 @@ private:
 /// Whether a job is running now: its report must not be closed.
 bool isJobRunning();
 
-/// Does work that no other job may run beside. @param error  receives why it was not done, as when another one runs
+/// Does work while no other job runs. @param error  receives why it was not done, as when another one runs
 /// @return whether it was done
 bool doAsOnlyJob(QString &error, const std::function<void()> &work);
 
-/// Reads the job of a recipe with the user's preferences, and does work with it that no other job may run beside.
+/// Reads the job of a recipe with the user's preferences, and does work with it while no other job runs.
 /// @param error  receives why it was not done: what is wrong with the job, or that another one runs
 /// @return whether it was done
 bool doWithJob(const ReportRecipe &recipe, QString &error,

@@ -15,7 +15,7 @@ class QTreeWidget;
 namespace kareport
 {
 
-/// A pane with what there was to say when a report was made: kind, text, line of the report and place of each note.
+/// A pane with the notes on a report: kind, text, line of the report and place of each.
 class NotesPane : public QDockWidget
 {
 public:

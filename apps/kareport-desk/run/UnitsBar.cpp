@@ -72,8 +72,8 @@ Widget *UnitsBar::add(Widget *widget, const QString &name)
 {
     widget->setAccessibleName(name);
     widget->setToolTip(name);
-    // As the other bars, it is not on the way of the Tab key through the reports; within it, that goes from box to box. The
-    // wheel chooses nothing on its way over the bar.
+    // As with the other bars, the Tab key does not reach it from the reports; within it, Tab goes from box to box. The wheel
+    // chooses nothing when the mouse passes over the bar.
     widget->setFocusPolicy(Qt::ClickFocus);
     boxes_.push_back(widget);
     widget->installEventFilter(this);

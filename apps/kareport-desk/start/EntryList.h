@@ -9,7 +9,7 @@
 namespace kareport
 {
 
-/// A line of a list of things to open: a name, and quietly below it what else is known of it.
+/// A line of a list of things to open: a name, and below it in a quieter colour what else is known of it.
 struct Entry
 {
     QString id; ///< that the list says when the entry is chosen
