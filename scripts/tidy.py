@@ -4,8 +4,8 @@
     scripts/tidy.py --jobs N FOLDER...
 
 Most of the time goes into the headers of Qt and of the standard library. So a plugin (tidy-scope.cpp) keeps the checks out of
-them, and sources that are compiled with the same options are read several at a time, in a file that includes them. What is
-found in such a file is looked for again in each source that it names alone, and said as it is there.
+them, and many sources are read at a time, in a file that includes them. What is found in such a file is looked for again in
+each source that it names alone, and said as it is there.
 
 A source that was found clean is not read again while it, the headers of the project that it includes, its options, clang-tidy
 and the installed headers stay the same. So a run that was stopped goes on where it was. Exit status 1 when something was found.
@@ -27,8 +27,11 @@ ROOT = pathlib.Path(__file__).resolve().parent.parent
 BUILD = ROOT / "build/tidy"
 CLEAN = BUILD / "clean"
 # Bytes of sources in a file that includes them. More costs memory, and reading more again when one of them is wrong.
-MOST = 60_000
+MOST = 120_000
 
+# Options that change the code and not what the sources mean.
+CODE = re.compile(r"-(O.*|g.*|f(PI[CE]|visibility.*|pch-.*|no-semantic-interposition|stack-.*|cf-protection.*)"
+                  r"|[DU]_FORTIFY_SOURCE.*|Winvalid-pch)")
 INCLUDE = re.compile(r'^[ \t]*#[ \t]*include[ \t]*(["<])([^">\n]+)[">]', re.MULTILINE)
 # What begins a line outside of classes and functions.
 TYPE = re.compile(r"^(?:class|struct|union|enum(?: class)?|using|#define) (\w+)(?!.*;)", re.MULTILINE)
@@ -61,6 +64,44 @@ def included_by(path, folders):
     return found
 
 
+class Options:
+    """What a source is compiled with, as far as it matters here."""
+
+    def __init__(self, arguments):
+        self.others = []
+        self.folders = [] # with the option before each
+        self.macros = {}
+        arguments = iter(arguments)
+        for argument in arguments:
+            if argument in ("-o", "-c"):
+                next(arguments)
+            elif argument.startswith("-I") or argument == "-isystem":
+                folder = next(arguments) if argument == "-isystem" else argument[2:]
+                self.folders.append((argument[:2] if argument[1] == "I" else argument, folder))
+            elif argument.startswith("-D"):
+                name, _, value = argument[2:].partition("=")
+                self.macros[name] = value
+            elif argument.startswith("-U"):
+                self.macros.pop(argument[2:], None)
+            elif not CODE.fullmatch(argument):
+                self.others.append(argument)
+        self.macros.pop("_FORTIFY_SOURCE", None)
+
+    def fits(self, other):
+        common = self.macros.keys() & other.macros.keys()
+        return self.others == other.others and all(self.macros[name] == other.macros[name] for name in common)
+
+    def add(self, other):
+        """Headers have names of their own, so that no folder more makes a file include another one."""
+        self.folders += [folder for folder in other.folders if folder not in self.folders]
+        self.macros |= other.macros
+
+    def arguments(self):
+        folders = [option + folder for option, folder in self.folders]
+        macros = [f"-D{name}={value}" if value else f"-D{name}" for name, value in self.macros.items()]
+        return [*macros, *folders, *self.others, "-fPIC"] # which Qt asks for
+
+
 class Source:
     """A file that is compiled, with its options."""
 
@@ -68,13 +109,9 @@ class Source:
         self.path = entry["file"]
         self.directory = entry["directory"]
         arguments = shlex.split(entry["command"])
-        arguments = arguments[next(i for i, one in enumerate(arguments) if one.endswith("clang++")) + 1:]
-        del arguments[arguments.index("-o"):arguments.index("-o") + 2]
-        del arguments[arguments.index("-c"):arguments.index("-c") + 2]
-        self.options = tuple(arguments)
+        self.options = Options(arguments[next(i for i, one in enumerate(arguments) if one.endswith("clang++")) + 1:])
+        self.folders = tuple(folder for _, folder in self.options.folders)
         # Test files are compiled in files that include several of them already.
-        self.folders = tuple(one[2:] for one in arguments if one.startswith("-I")) + tuple(
-            after for one, after in zip(arguments, arguments[1:]) if one == "-isystem")
         self.files = [self.path] + [file for file in included_by(self.path, self.folders) if file.endswith(".cpp")]
         self.size = sum(len(text_of(file)) for file in self.files)
 
@@ -87,7 +124,7 @@ class Source:
                 if file not in files:
                     files.add(file)
                     unread.append(file)
-        parts = [tools, self.directory, *self.options, *(f"{file} {hash_of(file)}" for file in sorted(files))]
+        parts = [tools, self.directory, *self.options.arguments(), *(f"{file} {hash_of(file)}" for file in sorted(files))]
         return hashlib.sha256("\0".join(parts).encode()).hexdigest()
 
     @functools.cached_property
@@ -139,7 +176,7 @@ def batches_of(sources):
     batches = []
     for source in sources:
         for batch in batches:
-            if (batch[0].options == source.options and sum(one.size for one in batch) + source.size <= MOST
+            if (all(source.options.fits(one.options) for one in batch) and sum(one.size for one in batch) + source.size <= MOST
                     and all(source.fits(one) for one in batch)):
                 batch.append(source)
                 break
@@ -162,13 +199,17 @@ def made_plugin():
 def read(sources, plugin):
     """@return what clang-tidy says of sources that are read together; empty when it finds nothing"""
     path = sources[0].path
+    options = Options([])
+    options.others = sources[0].options.others
+    for source in sources:
+        options.add(source.options)
     if len(sources) > 1:
         text = "".join(f'#include "{source.path}"\n' for source in sources)
         folder = BUILD / "read"
         folder.mkdir(exist_ok=True)
         path = folder / (hashlib.sha256(text.encode()).hexdigest()[:16] + ".cpp")
         path.write_text(text)
-    run = subprocess.run(["clang-tidy", f"--load={plugin}", "--quiet", "--warnings-as-errors=*", str(path), "--", *sources[0].options],
+    run = subprocess.run(["clang-tidy", f"--load={plugin}", "--quiet", "--warnings-as-errors=*", str(path), "--", *options.arguments()],
                          cwd=sources[0].directory, capture_output=True, text=True, check=False)
     if len(sources) > 1:
         path.unlink()
@@ -205,7 +246,7 @@ def main():
     parser = argparse.ArgumentParser()
     parser.add_argument("--jobs", type=int, default=1)
     parser.add_argument("folders", nargs="+")
-    options = parser.parse_args()
+    chosen = parser.parse_args()
     CLEAN.mkdir(parents=True, exist_ok=True)
     tools = "".join(subprocess.run(command, capture_output=True, text=True, check=True).stdout
                     for command in (["clang-tidy", "--version"], ["dpkg-query", "-W", "*-dev"]))
@@ -213,19 +254,20 @@ def main():
     plugin = made_plugin()
     tools += plugin.name
     entries = add_example(BUILD / "compile_commands.json")
-    batches = []
-    for folder in options.folders:
+    waiting = []
+    for folder in chosen.folders:
         sources = of_folder(entries, folder)
         unread = [source for source in sources if not (CLEAN / source.key(tools)).exists()]
         print(f"clang-tidy: {folder} ({len(sources)} files, {len(unread)} to read)" if sources else
               f"clang-tidy: {folder}: nothing of it is built", flush=True)
-        batches += batches_of(unread)
+        waiting += unread
+    batches = batches_of(waiting)
     status = 0
-    with concurrent.futures.ThreadPoolExecutor(options.jobs) as pool:
-        waiting = {pool.submit(check, batch, tools, plugin): batch for batch in batches}
-        for number, done in enumerate(concurrent.futures.as_completed(waiting), 1):
-            first = os.path.relpath(waiting[done][0].path, ROOT)
-            print(f"clang-tidy: {number} of {len(batches)}: {first} and {len(waiting[done]) - 1} more", flush=True)
+    with concurrent.futures.ThreadPoolExecutor(chosen.jobs) as pool:
+        read_now = {pool.submit(check, batch, tools, plugin): batch for batch in batches}
+        for number, done in enumerate(concurrent.futures.as_completed(read_now), 1):
+            first = os.path.relpath(read_now[done][0].path, ROOT)
+            print(f"clang-tidy: {number} of {len(batches)}: {first} and {len(read_now[done]) - 1} more", flush=True)
             if done.result():
                 print(done.result(), flush=True)
                 status = 1

@@ -21,6 +21,7 @@ import re, sys, os
 if "--version" in sys.argv:
     sys.exit(print(open("VERSION").read()))
 start = sys.argv[sys.argv.index("--") - 1]
+open("OPTIONS", "w").write(" ".join(sys.argv[sys.argv.index("--") + 1:]))
 files = re.findall('#include "(/.*)"', open(start).read()) or [start]
 with open("READ", "a") as log:
     log.write(" ".join(sorted(os.path.relpath(file) for file in files)) + "\n")
@@ -94,10 +95,22 @@ class Tidy(unittest.TestCase):
                 self.write(name, (self.root / name).read_text() + "// a comment\n")
                 self.assertEqual(self.run_over(), (0, [], [again]))
 
-    def test_other_options_are_read_apart(self):
-        self.options["page/B.cpp"] = "-O3"
-        self.assertEqual(sorted(self.run_over()[2]), ["page/A.cpp page/C.cpp", "page/B.cpp"])
-        self.options["page/B.cpp"] = "-O1"
+    def test_options_that_mean_something_else_are_read_apart(self):
+        for options, apart in (("-DA=2", True), ("-DB=1", False), ("-Wextra", True), ("-O0 -g1 -fPIE", False),
+                               ("-DA=1 -I/b -isystem /c", False), ("-DA=2 -UA", False)):
+            with self.subTest(options):
+                self.options = {"page/A.cpp": "-DA=1 -O2", "page/B.cpp": options, "page/C.cpp": "-I/a"}
+                self.assertEqual(len(self.run_over()[2]), 2 if apart else 1)
+                shutil.rmtree(self.root / "build/tidy/clean")
+
+    def test_files_that_are_read_together_have_all_options(self):
+        self.options = {"page/A.cpp": "-DA=1 -I/a -Wall", "page/B.cpp": "-DB -isystem /b -Wall", "page/C.cpp": "-I/a -Wall"}
+        self.run_over()
+        self.assertEqual((self.root / "OPTIONS").read_text(), "-DA=1 -DB -I/a -isystem/b -Wall -fPIC")
+
+    def test_other_options_are_read_again(self):
+        self.run_over()
+        self.options["page/B.cpp"] = "-DB"
         self.assertEqual(self.run_over()[2], ["page/B.cpp"])
 
     def test_equal_names_are_read_apart(self):
@@ -111,8 +124,8 @@ class Tidy(unittest.TestCase):
                 shutil.rmtree(self.root / "build/tidy/clean")
 
     def test_large_files_are_read_apart(self):
-        self.write("page/B.cpp", "// " + "long " * 10_000)
-        self.write("page/C.cpp", "// " + "long " * 10_000)
+        self.write("page/B.cpp", "// " + "long " * 20_000)
+        self.write("page/C.cpp", "// " + "long " * 20_000)
         self.assertEqual(sorted(self.run_over()[2]), ["page/A.cpp page/B.cpp", "page/C.cpp"])
 
     def test_a_mistake_is_said_where_it_is(self):
