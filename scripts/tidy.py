@@ -4,8 +4,8 @@
     scripts/tidy.py --jobs N FOLDER...
 
 Most of the time goes into the headers of Qt and of the standard library. So a plugin (tidy-scope.cpp) keeps the checks out of
-them, and many sources are read at a time, in a file that includes them. What is found in such a file is looked for again in
-each source that it names alone, and said as it is there.
+them, and many sources are read at a time, one after the other in one file. What is found in such a file is looked for again
+in each source that it names alone, and said as it is there.
 
 A source that was found clean is not read again while it, the headers of the project that it includes, its options, clang-tidy
 and the installed headers stay the same. So a run that was stopped goes on where it was. Exit status 1 when something was found.
@@ -26,7 +26,7 @@ import sys
 ROOT = pathlib.Path(__file__).resolve().parent.parent
 BUILD = ROOT / "build/tidy"
 CLEAN = BUILD / "clean"
-# Bytes of sources in a file that includes them. More costs memory, and reading more again when one of them is wrong.
+# Bytes of sources that are read as one file. More costs memory, and reading more again when one of them is wrong.
 MOST = 120_000
 
 # Options that change the code and not what the sources mean.
@@ -160,7 +160,7 @@ def add_example(database):
 
 
 def of_folder(entries, folder):
-    """The sources of a folder. Test files are read in the files that include several of them."""
+    """The sources of a folder. Test files come in the files that include several of them."""
     found = {}
     for entry in entries:
         path = pathlib.Path(entry["file"])
@@ -196,28 +196,54 @@ def made_plugin():
     return made
 
 
+def lines_of(path, seen):
+    """The lines of a source, with those of the sources that it includes, each with its file and number.
+
+    @param seen  headers that are included already: to include one again would be a finding
+    """
+    included = [name for _, name in INCLUDE.findall(text_of(path))]
+    for number, line in enumerate(text_of(path).splitlines(), 1):
+        match = INCLUDE.match(line)
+        if match and match[2].endswith(".cpp"):
+            yield from lines_of(match[2], seen)
+            continue
+        if match and match[2] in seen and included.count(match[2]) == 1:
+            line = ""
+        elif match:
+            seen.add(match[2])
+        yield path, number, line
+
+
 def read(sources, plugin):
     """@return what clang-tidy says of sources that are read together; empty when it finds nothing"""
-    path = sources[0].path
     options = Options([])
     options.others = sources[0].options.others
     for source in sources:
         options.add(source.options)
-    if len(sources) > 1:
-        text = "".join(f'#include "{source.path}"\n' for source in sources)
-        folder = BUILD / "read"
-        folder.mkdir(exist_ok=True)
-        path = folder / (hashlib.sha256(text.encode()).hexdigest()[:16] + ".cpp")
+    path = pathlib.Path(sources[0].path)
+    arguments = options.arguments()
+    lines = []
+    if len(sources) > 1 or len(sources[0].files) > 1:
+        # Not by #include: calls are followed in the main file alone.
+        seen = set()
+        for source in sources:
+            lines += [(source.path, 1, f"// {source.path}"), *lines_of(source.path, seen)]
+        text = "".join(f"{line}\n" for _, _, line in lines)
+        path = BUILD / "read" / (hashlib.sha256(text.encode()).hexdigest()[:16] + ".cpp")
+        path.parent.mkdir(exist_ok=True)
         path.write_text(text)
-    run = subprocess.run(["clang-tidy", f"--load={plugin}", "--quiet", "--warnings-as-errors=*", str(path), "--", *options.arguments()],
+        arguments += [f"-iquote{folder}" for folder in sorted({os.path.dirname(file) for file, _, _ in lines})]
+    run = subprocess.run(["clang-tidy", f"--load={plugin}", "--quiet", "--warnings-as-errors=*", str(path), "--", *arguments],
                          cwd=sources[0].directory, capture_output=True, text=True, check=False)
-    if len(sources) > 1:
+    if lines:
         path.unlink()
     if run.returncode == 0:
         return ""
     # On standard error it counts what it does not show.
     errors = [line for line in run.stderr.splitlines() if "error:" in line or "Error" in line]
-    return run.stdout + "\n".join(errors) or f"{path}: clang-tidy ended with {run.returncode}"
+    said = run.stdout + "\n".join(errors) or f"{path}: clang-tidy ended with {run.returncode}"
+    return re.sub(rf"^{re.escape(str(path))}:(\d+):", lambda place: "{}:{}:".format(*lines[int(place[1]) - 1]) if lines
+                  else place[0], said, flags=re.MULTILINE)
 
 
 def check(sources, tools, plugin):

@@ -21,19 +21,24 @@ import re, sys, os
 if "--version" in sys.argv:
     sys.exit(print(open("VERSION").read()))
 start = sys.argv[sys.argv.index("--") - 1]
-open("OPTIONS", "w").write(" ".join(sys.argv[sys.argv.index("--") + 1:]))
-files = re.findall('#include "(/.*)"', open(start).read()) or [start]
+options = sys.argv[sys.argv.index("--") + 1:]
+open("OPTIONS", "w").write(" ".join(option for option in options if not option.startswith("-iquote")))
+text = open(start).read()
+files = re.findall("^// (/.*[.]cpp)$", text, re.MULTILINE) or [start]
 with open("READ", "a") as log:
     log.write(" ".join(sorted(os.path.relpath(file) for file in files)) + "\n")
-for file in list(files):
-    files += [os.path.join(os.path.dirname(file), name) for name in re.findall('#include "(.*)"', open(file).read())]
-status = 0
-texts = [open(file).read() for file in files]
-for file, text in dict(zip(files, texts)).items():
-    for number, line in enumerate(text.splitlines(), 1):
-        if "BAD" in line or "ALONE" in line and sum(text.count("ALONE") for text in texts) > 1:
-            print(f"{file}:{number}:1: error: {line}")
-            status = 1
+folders = [option[len("-iquote"):] for option in options if option.startswith("-iquote")] or [os.path.dirname(start)]
+included = re.findall('^#include "(.*)"', text, re.MULTILINE)
+status = 0 if len(included) == len(set(included)) else 1
+for name in included:
+    path = [f"{folder}/{name}" for folder in folders if os.path.exists(f"{folder}/{name}")][0]
+    if "BAD" in open(path).read():
+        print(f"{path}:1:1: error: BAD")
+        status = 1
+for number, line in enumerate(text.splitlines(), 1):
+    if "BAD" in line or "ALONE" in line and text.count("ALONE") > 1:
+        print(f"{start}:{number}:1: error: {line}")
+        status = 1
 print("3 errors generated.", file=sys.stderr)
 sys.exit(status)
 '''
@@ -151,8 +156,8 @@ class Tidy(unittest.TestCase):
             self.write(self.compiled[-1], f'#include "{self.root}/tests/page/{name}Test.cpp"\n')
         status, said, files = self.run_over("tests")
         self.assertEqual((status, said), (1, ["tests/page/ATest.cpp:4:1: error: BAD"]))
-        self.assertEqual(files, ["build/tidy/tests/page/batch0.cpp build/tidy/tests/page/batch1.cpp", "tests/page/ATest.cpp",
-                                 "tests/page/BTest.cpp"])
+        batches = [f"build/tidy/tests/page/batch{number}.cpp" for number in range(2)]
+        self.assertEqual(files, [" ".join(batches), *batches])
 
 
 if __name__ == "__main__":
