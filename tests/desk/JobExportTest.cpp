@@ -90,7 +90,7 @@ TEST(JobExport, FurtherPagesReplaceNoOtherFile)
     ASSERT_TRUE(desk.frame->OpenFile(desk.folder.path("job.json")));
     desk.exportTo("a.html");
     ASSERT_EQ(desk.messages.size(), 1);
-    EXPECT_TRUE(desk.messages.first().contains(u"is there already")) << desk.messages.first().toStdString();
+    EXPECT_TRUE(desk.messages.first().contains(u"already exists")) << desk.messages.first().toStdString();
     EXPECT_EQ(desk.folder.bytesOf("a-2.html"), "<p>a page of its own</p>");
     EXPECT_FALSE(QFile::exists(desk.folder.path("a.html")));
     ASSERT_TRUE(QFile::remove(desk.folder.path("a-2.html")));

@@ -131,7 +131,7 @@ TEST(SavedReportPages, ReturnsWithinLinesDoNotHoldAPageLengthOfAnOlderText)
     EXPECT_FALSE(report->IsPageFixed()) << "as if it were opened now";
 }
 
-TEST(SavedReportText, ComesBackAsTheGuideAndTheManualPageSay)
+TEST(SavedReportText, OpensAsTheGuideAndTheManualPageSay)
 {
     const QString text = QStringLiteral("TALVEN  \u00E9 \u4E2D \U0001F600\r\n\r\n  two  blanks\tand a tab \r\n") +
                          QStringLiteral("1\u00A0234\r\n\r\n\r\n").repeated(3) + QStringLiteral("the last line\r\n");
@@ -152,7 +152,7 @@ TEST(SavedReportText, ComesBackAsTheGuideAndTheManualPageSay)
     for (const char *page : {"/../docs/guide-desk.md", "/../docs/kareport-desk.1"}) {
         QFile file(QStringLiteral(KAREPORT_TEST_DIR) + QLatin1StringView(page));
         ASSERT_TRUE(file.open(QIODevice::ReadOnly)) << page;
-        EXPECT_TRUE(file.readAll().contains("comes back as it was before it was saved")) << page;
+        EXPECT_TRUE(file.readAll().contains("opens as it was when it was saved")) << page;
     }
 }
 
