@@ -122,7 +122,7 @@ TableShape::Condition readCondition(const JsonNode &node, const QStringList &oth
     if (const JsonNode beside = node[QStringLiteral("beside")]; beside.exists()) {
         condition.beside = readName(beside);
         if (isOfValues || kind == Kind::Exists) {
-            beside.fail(Xlate("\"beside\" goes with above, below and outside alone"));
+            beside.fail(Xlate("\"beside\" was expected only with above, below or outside"));
         }
     }
     return condition;
