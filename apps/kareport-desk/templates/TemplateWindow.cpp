@@ -5,6 +5,7 @@
 #include "TemplateFindBar.h"
 #include "TemplatePage.h"
 #include "TemplateTextEdit.h"
+#include "TextDifference.h"
 #include "Xlate.h"
 
 #include <QComboBox>
@@ -264,10 +265,9 @@ void TemplateWindow::renameVariable()
 {
     const QString text = edit_->wholeText();
     const qsizetype position = edit_->textCursor().position();
-    const auto use = variableAt(text, position);
+    const auto use = variableAt(*outline_, position);
     if (!use) {
-        AppMessageBox(Xlate("Put the cursor on a variable first: in a field, a sort key or a dictionary."));
-        return;
+        return; // the command is disabled then
     }
     if (const auto name = askNewName(use->name); name && *name != use->name) {
         carryOut(withRenamedVariable(text, position, *name));

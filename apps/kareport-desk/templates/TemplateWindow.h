@@ -15,10 +15,13 @@
 #include <functional>
 #include <memory>
 #include <optional>
+#include <vector>
 
+class QAction;
 class QComboBox;
 class QLabel;
 class QMenu;
+class QPlainTextEdit;
 class QTreeWidget;
 
 namespace kareport
@@ -49,6 +52,8 @@ public:
     bool arePagesUpToDate() const { return shown_ == requested_; }
     /// The same of the remarks as well.
     bool isUpToDate() const { return arePagesUpToDate() && checked_ == requested_; }
+    /// Brings the states of all commands up to date, and the reasons of those that cannot act.
+    void updateCommands();
 
     TemplateTextEdit &edit() const { return *edit_; }
     TemplatePage &page() const { return *page_; }
@@ -67,10 +72,22 @@ protected:
     void closeEvent(QCloseEvent *event) override;
 
 private:
+    struct WindowCommand
+    {
+        QAction *action;
+        std::function<QString()> whyNot; ///< what keeps it from acting, as a sentence; null for what can always act
+    };
+
     // TemplateWindowLayout.cpp
     void makeDialogs();
     void makeBody();
+
+    // TemplateWindowMenus.cpp
     void makeMenus();
+    void addCommand(QMenu &menu, const QString &text, std::function<void()> act, std::function<QString()> whyNot = {});
+    void chooseCommand();
+    QPlainTextEdit &readPart() const;
+    QString whyNoEdit() const;
     void addFileMenu();
     void addEditMenu();
     void addInsertMenu();
@@ -126,6 +143,7 @@ private:
     FileWatch dataWatch_;
     QString messageText_;
     std::unique_ptr<PreviewWorker> worker_;
+    std::vector<WindowCommand> commands_;
 };
 
 } // namespace kareport

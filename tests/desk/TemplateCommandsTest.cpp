@@ -1,0 +1,193 @@
+#include "OpenedTemplate.h"
+
+#include "CommandList.h"
+#include "TemplateFindBar.h"
+
+#include <QLabel>
+#include <QLineEdit>
+#include <QPushButton>
+#include <QStatusBar>
+#include <QTimer>
+
+#include <gtest/gtest.h>
+
+namespace
+{
+
+using kareport::CommandList;
+using kareport::ListedCommand;
+
+QStringList namesOf(const std::vector<ListedCommand> &commands)
+{
+    QStringList names;
+    for (const ListedCommand &command : commands) {
+        names.append(command.name);
+    }
+    return names;
+}
+
+/// Answers the list of commands when it opens: types, looks, and presses Enter.
+void whenListed(const QString &typed, const std::function<void(CommandList &)> &look)
+{
+    QTimer::singleShot(0, qApp, [typed, look] {
+        auto *list = dynamic_cast<CommandList *>(QApplication::activeModalWidget());
+        ASSERT_NE(list, nullptr);
+        auto *field = list->findChild<QLineEdit *>();
+        QTest::keyClicks(field, typed);
+        look(*list);
+        QTest::keyClick(field, Qt::Key_Return);
+        if (list->isVisible()) {
+            list->reject();
+        }
+    });
+}
+
+/// Says of every command that it is either enabled or says why not.
+void expectReasons(const OpenedTemplate &opened, const char *when)
+{
+    opened.window->updateCommands();
+    for (const ListedCommand &command : kareport::listedCommands(*opened.window->menuBar())) {
+        EXPECT_EQ(command.action->isEnabled(), command.action->statusTip().isEmpty())
+            << when << ": " << command.name.toStdString() << ": " << command.action->statusTip().toStdString();
+    }
+}
+
+TEST(TemplateCommands, AllAreListedWithTheirKeys)
+{
+    OpenedTemplate opened;
+    const std::vector<ListedCommand> commands = kareport::listedCommands(*opened.window->menuBar());
+    QStringList names = namesOf(commands);
+    qsizetype inMenus = 0;
+    for (const QAction *menu : opened.window->menuBar()->actions()) {
+        for (const QAction *action : menu->menu()->actions()) {
+            inMenus += action->isSeparator() ? 0 : 1;
+        }
+    }
+    EXPECT_EQ(names.size(), inMenus) << names.join(u'\n').toStdString();
+    EXPECT_EQ(names.removeDuplicates(), 0);
+    EXPECT_TRUE(names.contains(QStringLiteral("Insert › Dictionary")));
+    EXPECT_TRUE(names.contains(QStringLiteral("Edit › Rename Variable")));
+    QStringList keys;
+    for (const ListedCommand &command : commands) {
+        EXPECT_FALSE(command.action->shortcut().isEmpty()) << command.name.toStdString();
+        keys.append(command.action->shortcut().toString());
+    }
+    EXPECT_EQ(keys.removeDuplicates(), 0) << "a key means one thing";
+}
+
+TEST(TemplateCommands, TheListOpensByItsKeyAndRunsACommand)
+{
+    OpenedTemplate opened;
+    opened.window->activateWindow();
+    ASSERT_TRUE(QTest::qWaitForWindowActive(opened.window));
+    opened.putAfter("<Label>North");
+    whenListed(QStringLiteral("insert tab"), [](CommandList &list) {
+        EXPECT_EQ(list.findChild<QTreeWidget *>()->currentItem()->text(0), QStringLiteral("Insert › Table"));
+        EXPECT_EQ(list.findChild<QTreeWidget *>()->currentItem()->text(1),
+                  QKeySequence(QStringLiteral("Ctrl+Shift+T")).toString(QKeySequence::NativeText));
+    });
+    QTest::keyClick(&opened.window->edit(), Qt::Key_P, Qt::ControlModifier | Qt::ShiftModifier);
+    EXPECT_TRUE(opened.text().contains(QStringLiteral("<Name>Table1</Name>")));
+}
+
+TEST(TemplateCommands, WhatCannotActSaysWhyInTheList)
+{
+    OpenedTemplate opened;
+    opened.putAfter("<Title>");
+    const QString before = opened.text();
+    whenListed(QStringLiteral("insert field"), [](CommandList &list) {
+        QStringList texts;
+        for (const QLabel *label : list.findChildren<QLabel *>()) {
+            texts.append(label->text());
+        }
+        EXPECT_TRUE(
+            texts.contains(QStringLiteral("A field belongs to a table or a block: put the cursor into one.")))
+            << texts.join(u'\n').toStdString();
+        QTest::keyClick(list.findChild<QLineEdit *>(), Qt::Key_Return);
+        EXPECT_TRUE(list.isVisible()) << "Enter does nothing";
+    });
+    opened.choose("All Commands...");
+    EXPECT_EQ(opened.text(), before);
+}
+
+TEST(TemplateCommands, EveryCommandThatIsDisabledSaysWhy)
+{
+    OpenedTemplate opened;
+    const auto isEnabled = [&opened](const char *name) { return opened.command(name)->isEnabled(); };
+    opened.putAfter("<Title>");
+    expectReasons(opened, "as it was opened");
+    for (const char *name : {"Save", "Undo", "Redo", "Cut", "Copy", "Find Next", "Rename Variable...", "Field",
+                             "Next Remark", "Previous Remark"})
+    {
+        EXPECT_FALSE(isEnabled(name)) << name;
+    }
+    opened.putAfter("<VariableName>North");
+    EXPECT_TRUE(isEnabled("Rename Variable..."));
+    EXPECT_TRUE(isEnabled("Field"));
+    opened.putAfter("<Type>");
+    opened.type("Z");
+    opened.settle();
+    expectReasons(opened, "with a mistake");
+    for (const char *name : {"Save", "Undo", "Next Remark", "Previous Remark"}) {
+        EXPECT_TRUE(isEnabled(name)) << name;
+    }
+    opened.window->edit().selectAll();
+    expectReasons(opened, "all is selected");
+    EXPECT_TRUE(isEnabled("Cut"));
+    EXPECT_TRUE(isEnabled("Copy"));
+    opened.window->page().setFocus();
+    EXPECT_FALSE(isEnabled("Copy")) << "nothing is selected of the pages";
+    opened.window->page().selectAll();
+    EXPECT_TRUE(isEnabled("Copy"));
+}
+
+TEST(TemplateCommands, ATemplateThatCanOnlyBeReadStaysAsItIs)
+{
+    // A character of a text that ends a line of its own in a window.
+    OpenedTemplate opened(controlTemplates().replace("<Label>North", "<Label>N\xE2\x80\xA9orth"));
+    ASSERT_TRUE(opened.window->edit().isReadOnly());
+    const QString before = opened.text();
+    opened.putAfter("<VariableName>North");
+    expectReasons(opened, "it can only be read");
+    for (const char *name : {"Cut", "Paste", "Complete", "Rename Variable...", "Field", "Table", "Block", "Dictionary"})
+    {
+        EXPECT_FALSE(opened.command(name)->isEnabled()) << name;
+    }
+    opened.choose("Find and Replace...");
+    auto &bar = opened.window->findBar();
+    bar.field().setText(QStringLiteral("Northing"));
+    EXPECT_FALSE(bar.replacement().isEnabled());
+    EXPECT_TRUE(bar.findNext());
+    bar.replace();
+    bar.replaceAll();
+    EXPECT_EQ(opened.text(), before);
+}
+
+TEST(TemplateCommands, ACommandThatHasBecomePossibleDoesNotMissItsKey)
+{
+    OpenedTemplate opened;
+    opened.window->activateWindow();
+    ASSERT_TRUE(QTest::qWaitForWindowActive(opened.window));
+    opened.putAfter("<Label>North");
+    opened.type("2");
+    QTest::keyClick(&opened.window->edit(), Qt::Key_S, Qt::ControlModifier);
+    EXPECT_FALSE(opened.window->isWindowModified());
+    EXPECT_TRUE(opened.folder.bytesOf("t.xml").contains("<Label>North2"));
+}
+
+TEST(TemplateCommands, ReasonsAreSaidInTheirOwnWindow)
+{
+    OpenedTemplate opened;
+    QMenu *edit = opened.window->menuBar()->actions().at(1)->menu();
+    edit->popup(QPoint(50, 50));
+    QCoreApplication::processEvents();
+    QAction *undo = opened.command("Undo");
+    ASSERT_FALSE(undo->isEnabled());
+    QTest::mouseMove(edit, edit->actionGeometry(undo).center());
+    QCoreApplication::processEvents();
+    EXPECT_EQ(opened.window->statusBar()->currentMessage(), QStringLiteral("There is nothing to undo."));
+    EXPECT_EQ(opened.desk.frame->statusBar()->currentMessage(), QString());
+    edit->close();
+}
+
+} // namespace
