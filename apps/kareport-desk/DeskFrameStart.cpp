@@ -118,5 +118,5 @@ QString DeskFrame::OriginFile(const UDocument *report) const
         return {};
     }
     const auto *file = std::get_if<QString>(&recipe->origin);
-    return file != nullptr ? *file : std::get<kareport::TemplateJob>(recipe->origin).data;
+    return file != nullptr ? *file : std::get<kareport::TemplateJob>(recipe->origin).mainFile();
 }

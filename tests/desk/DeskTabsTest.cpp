@@ -116,8 +116,7 @@ TEST(DeskTabs, ReportWindowsThatAreKeptAreTabsOfARowOfTheirOwn)
     // The one of the middle is opened with its text; the others stay together.
     windows[1]->ShowReport();
     settle();
-    EXPECT_EQ(desk.frame->tabifiedDockWidgets(windows[0]->GetDock()),
-              QList<QDockWidget *>{windows[2]->GetDock()});
+    EXPECT_EQ(desk.frame->tabifiedDockWidgets(windows[0]->GetDock()), QList<QDockWidget *>{windows[2]->GetDock()});
     EXPECT_TRUE(desk.frame->GetActiveView() != nullptr);
 
     // One that the user has put elsewhere takes the next one along.

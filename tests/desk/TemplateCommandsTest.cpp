@@ -100,8 +100,7 @@ TEST(TemplateCommands, WhatCannotActSaysWhyInTheList)
         for (const QLabel *label : list.findChildren<QLabel *>()) {
             texts.append(label->text());
         }
-        EXPECT_TRUE(
-            texts.contains(QStringLiteral("A field belongs to a table or a block: put the cursor into one.")))
+        EXPECT_TRUE(texts.contains(QStringLiteral("A field belongs to a table or a block: put the cursor into one.")))
             << texts.join(u'\n').toStdString();
         QTest::keyClick(list.findChild<QLineEdit *>(), Qt::Key_Return);
         EXPECT_TRUE(list.isVisible()) << "Enter does nothing";

@@ -312,7 +312,7 @@ void DeskRuns::saveAsJob()
     }
     const ReportRecipe recipe = made->recipe; // the report may be closed while the dialog is open
     const auto *chosen = std::get_if<TemplateJob>(&recipe.origin);
-    const QFileInfo beside(chosen != nullptr ? chosen->data : recipe.jobFile());
+    const QFileInfo beside(chosen != nullptr ? chosen->mainFile() : recipe.jobFile());
     SaveRequest request;
     request.filter = Xlate("Jobs") + QStringLiteral(" (*.json)|*.json||");
     request.defaultExtension = QStringLiteral("json");

@@ -107,33 +107,40 @@ void TemplateWindow::addEditMenu()
             return read.isEmpty() ? why() : read;
         };
     };
-    addCommand(menu, Xlate("&Undo\tCtrl+Z"), [this] { edit_->undo(); }, [this] {
-        return edit_->document()->isUndoAvailable() ? QString() : Xlate("There is nothing to undo.");
-    });
-    addCommand(menu, Xlate("&Redo\tCtrl+Shift+Z"), [this] { edit_->redo(); }, [this] {
-        return edit_->document()->isRedoAvailable() ? QString() : Xlate("There is nothing to redo.");
-    });
+    addCommand(
+        menu, Xlate("&Undo\tCtrl+Z"), [this] { edit_->undo(); },
+        [this] { return edit_->document()->isUndoAvailable() ? QString() : Xlate("There is nothing to undo."); });
+    addCommand(
+        menu, Xlate("&Redo\tCtrl+Shift+Z"), [this] { edit_->redo(); },
+        [this] { return edit_->document()->isRedoAvailable() ? QString() : Xlate("There is nothing to redo."); });
     menu.addSeparator();
     const auto isSelected = [](const QPlainTextEdit &part) {
         return part.textCursor().hasSelection() ? QString() : Xlate("No text is selected.");
     };
-    addCommand(menu, Xlate("Cu&t\tCtrl+X"), [this] { edit_->cut(); },
-               unlessRead([this, isSelected] { return isSelected(*edit_); }));
-    addCommand(menu, Xlate("&Copy\tCtrl+C"), [this] { readPart().copy(); },
-               [this, isSelected] { return isSelected(readPart()); });
-    addCommand(menu, Xlate("&Paste\tCtrl+V"), [this] { edit_->paste(); }, [this] { return whyNoEdit(); });
+    addCommand(
+        menu, Xlate("Cu&t\tCtrl+X"), [this] { edit_->cut(); },
+        unlessRead([this, isSelected] { return isSelected(*edit_); }));
+    addCommand(
+        menu, Xlate("&Copy\tCtrl+C"), [this] { readPart().copy(); },
+        [this, isSelected] { return isSelected(readPart()); });
+    addCommand(
+        menu, Xlate("&Paste\tCtrl+V"), [this] { edit_->paste(); }, [this] { return whyNoEdit(); });
     addCommand(menu, Xlate("Select &All\tCtrl+A"), [this] { readPart().selectAll(); });
     menu.addSeparator();
     const auto isSought = [this] {
         return findBar_->field().text().isEmpty() ? Xlate("No text has been looked for yet.") : QString();
     };
     addCommand(menu, Xlate("&Find and Replace...\tCtrl+F"), [this] { findBar_->open(); });
-    addCommand(menu, Xlate("Find &Next\tF3"), [this] { findBar_->findNext(); }, isSought);
-    addCommand(menu, Xlate("Find Pre&vious\tShift+F3"), [this] { findBar_->findPrevious(); }, isSought);
+    addCommand(
+        menu, Xlate("Find &Next\tF3"), [this] { findBar_->findNext(); }, isSought);
+    addCommand(
+        menu, Xlate("Find Pre&vious\tShift+F3"), [this] { findBar_->findPrevious(); }, isSought);
     menu.addSeparator();
-    addCommand(menu, Xlate("C&omplete\tCtrl+Space"), [this] { edit_->complete(true); }, [this] { return whyNoEdit(); });
-    addCommand(menu, Xlate("Rena&me Variable...\tF2"), [this] { renameVariable(); },
-               unlessRead([this] { return whyNoVariable(*outline_, edit_->textCursor().position()); }));
+    addCommand(
+        menu, Xlate("C&omplete\tCtrl+Space"), [this] { edit_->complete(true); }, [this] { return whyNoEdit(); });
+    addCommand(
+        menu, Xlate("Rena&me Variable...\tF2"), [this] { renameVariable(); },
+        unlessRead([this] { return whyNoVariable(*outline_, edit_->textCursor().position()); }));
 }
 
 void TemplateWindow::addInsertMenu()
@@ -164,8 +171,10 @@ void TemplateWindow::addViewMenu()
     const auto hasRemarks = [this] {
         return edit_->remarks().empty() ? Xlate("There are no remarks on the template.") : QString();
     };
-    addCommand(menu, Xlate("&Next Remark\tF8"), [this] { stepRemark(1); }, hasRemarks);
-    addCommand(menu, Xlate("&Previous Remark\tShift+F8"), [this] { stepRemark(-1); }, hasRemarks);
+    addCommand(
+        menu, Xlate("&Next Remark\tF8"), [this] { stepRemark(1); }, hasRemarks);
+    addCommand(
+        menu, Xlate("&Previous Remark\tShift+F8"), [this] { stepRemark(-1); }, hasRemarks);
     menu.addSeparator();
     addCommand(menu, Xlate("Text, &Pages, Remarks\tF6"), [this] { turnFocus(); });
     menu.addSeparator();
