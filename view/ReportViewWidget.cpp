@@ -102,6 +102,7 @@ ReportViewWidget::ReportViewWidget(QWidget *parent)
     for (QWidget *child : findChildren<QWidget *>()) {
         child->installEventFilter(this); // wherever the mouse is pressed
     }
+    loadLabel_->hide(); // while there is nothing to say it takes no room from a narrow window
     showPlace();
     showZoom();
 }
@@ -238,6 +239,7 @@ void ReportViewWidget::showLoading()
         edit_->isLoading() ? Xlate("Loading %1 %@@percent of a report").arg(edit_->loadedPercent()) : QString();
     if (text != loadLabel_->text() || !edit_->isLoading()) { // there are more pieces than percents
         showIn(*loadLabel_, text);
+        loadLabel_->setVisible(!text.isEmpty());
         placeTimer_.start();
     }
 }
