@@ -109,6 +109,9 @@ void DeskFrame::RestoreSession()
             OpenFile(file);
         }
     }
+    if (GetCommandDocument() != nullptr) {
+        activateWindow(); // the editors of templates are windows of their own
+    }
 }
 
 QString DeskFrame::OriginFile(const UDocument *report) const

@@ -1,13 +1,17 @@
 #include "OpenedTemplate.h"
 
 #include "CommandList.h"
+#include "Session.h"
 #include "TemplateFindBar.h"
 
+#include <QDragEnterEvent>
 #include <QLabel>
 #include <QLineEdit>
+#include <QMimeData>
 #include <QPushButton>
 #include <QStatusBar>
 #include <QTimer>
+#include <QUrl>
 
 #include <gtest/gtest.h>
 
@@ -187,6 +191,81 @@ TEST(TemplateCommands, ReasonsAreSaidInTheirOwnWindow)
     EXPECT_EQ(opened.window->statusBar()->currentMessage(), QStringLiteral("There is nothing to undo."));
     EXPECT_EQ(opened.desk.frame->statusBar()->currentMessage(), QString());
     edit->close();
+}
+
+QStringList windowEntries(const Desk &desk)
+{
+    QMenu *menu = desk.frame->menuBar()->actions().at(3)->menu();
+    Q_EMIT menu->aboutToShow();
+    QStringList texts;
+    for (const QAction *action : menu->actions()) {
+        texts.append(action->text());
+    }
+    return texts;
+}
+
+TEST(TemplateEditors, AreInTheListOfWindows)
+{
+    OpenedTemplate opened;
+    opened.desk.answer = MessageAnswer::No;
+    opened.folder.put("a.rep", savedText("TALVEN"));
+    ASSERT_TRUE(opened.desk.frame->OpenFile(opened.folder.path("a.rep")));
+    EXPECT_TRUE(windowEntries(opened.desk).contains(QStringLiteral("&2 t.xml")))
+        << windowEntries(opened.desk).join(u'\n').toStdString();
+    opened.putAfter("<Label>North");
+    opened.type("2");
+    EXPECT_TRUE(windowEntries(opened.desk).contains(QStringLiteral("&2 t.xml *")));
+    opened.desk.frame->activateWindow();
+    ASSERT_TRUE(QTest::qWaitForWindowActive(&*opened.desk.frame));
+    opened.desk.frame->menuBar()->actions().at(3)->menu()->actions().back()->trigger();
+    EXPECT_TRUE(QTest::qWaitForWindowActive(opened.window)) << "its entry brings it to the front";
+    opened.window->close();
+    EXPECT_FALSE(windowEntries(opened.desk).join(u' ').contains(QStringLiteral("t.xml")));
+}
+
+TEST(TemplateEditors, AreOpenedAgainWithTheReports)
+{
+    OpenedTemplate opened;
+    opened.desk.answer = MessageAnswer::No;
+    opened.folder.put("a.rep", savedText("TALVEN"));
+    ASSERT_TRUE(opened.desk.frame->OpenFile(opened.folder.path("a.rep")));
+    opened.desk.frame->close();
+    ASSERT_TRUE(opened.desk.frame->isHidden());
+    EXPECT_EQ(kareport::lastSession(), QStringList({opened.folder.path("t.xml"), opened.folder.path("a.rep")}));
+    opened.desk.frame.reset();
+    opened.desk.application.reset();
+    QCoreApplication::sendPostedEvents(nullptr, QEvent::DeferredDelete);
+    opened.desk.application.emplace();
+    opened.desk.frame.emplace();
+    opened.desk.frame->show();
+    opened.desk.frame->RestoreSession();
+    ASSERT_NE(windowOf(opened.folder.path("t.xml")), nullptr);
+    EXPECT_EQ(Desk::reports().size(), 1U);
+}
+
+TEST(TemplateEditors, TakeFilesThatAreDropped)
+{
+    OpenedTemplate opened;
+    opened.desk.answer = MessageAnswer::No;
+    opened.folder.put("a.rep", savedText("TALVEN"));
+    const QString before = opened.text();
+    const auto drop = [&opened](const char *name) {
+        QMimeData dropped;
+        dropped.setUrls({QUrl::fromLocalFile(opened.folder.path(name))});
+        dropped.setText(opened.folder.path(name)); // which a text would take
+        QWidget *text = opened.window->edit().viewport();
+        QDragEnterEvent enter(QPoint(9, 9), Qt::CopyAction, &dropped, Qt::LeftButton, Qt::NoModifier);
+        QApplication::sendEvent(text, &enter);
+        QDropEvent event(QPointF(9, 9), Qt::CopyAction, &dropped, Qt::LeftButton, Qt::NoModifier);
+        QApplication::sendEvent(text, &event);
+    };
+    opened.putAfter("<Label>North");
+    drop("points.csv");
+    EXPECT_EQ(opened.window->data().file, opened.folder.path("points.csv"));
+    EXPECT_EQ(opened.window->data().table, QStringLiteral("Points")) << "through the table of the cursor";
+    drop("a.rep");
+    EXPECT_EQ(Desk::reports().size(), 1U);
+    EXPECT_EQ(opened.text(), before) << "no name of a file is written into the template";
 }
 
 } // namespace

@@ -14,20 +14,6 @@
 namespace kareport
 {
 
-namespace
-{
-
-/// Whether a widget is the window, or belongs to it, as its menus and the panes that float do.
-bool belongsTo(const QWidget *widget, const QWidget &window)
-{
-    while (widget != nullptr && widget != &window) {
-        widget = widget->parentWidget();
-    }
-    return widget != nullptr;
-}
-
-} // namespace
-
 CommandTips::CommandTips(QMainWindow &frame, std::function<void()> update)
     : QObject(&frame), frame_(frame), update_(std::move(update))
 {

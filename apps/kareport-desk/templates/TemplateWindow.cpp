@@ -1,6 +1,7 @@
 #include "TemplateWindow.h"
 
 #include "AppMessageBox.h"
+#include "FileDrops.h"
 #include "PlainWidgets.h"
 #include "TemplateFindBar.h"
 #include "TemplatePage.h"
@@ -62,6 +63,7 @@ TemplateWindow::TemplateWindow()
     makeDialogs();
     makeBody();
     makeMenus();
+    new FileDrops(*this, [this](const QStringList &files) { takeDropped(files); });
     constexpr int workingAfter = 60; // milliseconds: what takes longer is said
     workingTimer_.setSingleShot(true);
     workingTimer_.setInterval(workingAfter);

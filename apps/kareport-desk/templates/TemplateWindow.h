@@ -104,6 +104,7 @@ private:
     void fillDataChoice();
     void chooseData(int index);
     void browseData();
+    void takeDropped(const QStringList &files);
     TemplateData dataOfFile(const QString &file) const;
 
     void textChanged();

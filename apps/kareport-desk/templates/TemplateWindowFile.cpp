@@ -1,6 +1,7 @@
 // The file of a template, and the data that its pages are made with.
 #include "AppMessageBox.h"
 #include "FileKind.h"
+#include "OpenTemplate.h"
 #include "ReplaceFile.h"
 #include "TemplatePage.h"
 #include "TemplateSource.h"
@@ -191,6 +192,19 @@ void TemplateWindow::browseData()
         setData(dataOfFile(*file));
     }
     fillDataChoice();
+}
+
+/// Rows of a text file are shown on the pages; any other file is opened.
+void TemplateWindow::takeDropped(const QStringList &files)
+{
+    for (const QString &file : files) {
+        const QString ending = QFileInfo(file).suffix().toLower();
+        if (ending == u"csv" || ending == u"txt") {
+            setData(dataOfFile(file));
+        } else {
+            openAnyFile(file);
+        }
+    }
 }
 
 /// A data file is written through the table or block that the cursor is in, or else through the template's first one.
