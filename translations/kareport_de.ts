@@ -5195,16 +5195,6 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
-        <source>No text has been looked for yet.</source>
-        <translation>Es wurde noch kein Text gesucht.</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
-        <source>&amp;Find and Replace...	Ctrl+F</source>
-        <translation>&amp;Suchen und Ersetzen ...	Ctrl+F</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>C&amp;omplete	Ctrl+Space</source>
         <translation>&amp;Vervollständigen	Ctrl+Space</translation>
     </message>
@@ -5212,6 +5202,16 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>Rena&amp;me Variable...	F2</source>
         <translation>Variable &amp;umbenennen ...	F2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
+        <source>No text has been looked for yet.</source>
+        <translation>Es wurde noch kein Text gesucht.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
+        <source>&amp;Find and Replace...	Ctrl+F</source>
+        <translation>&amp;Suchen und Ersetzen ...	Ctrl+F</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>

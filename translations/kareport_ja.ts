@@ -5195,16 +5195,6 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
-        <source>No text has been looked for yet.</source>
-        <translation>まだテキストを検索していません。</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
-        <source>&amp;Find and Replace...	Ctrl+F</source>
-        <translation>検索と置換(&amp;F)...	Ctrl+F</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>C&amp;omplete	Ctrl+Space</source>
         <translation>補完(&amp;O)	Ctrl+Space</translation>
     </message>
@@ -5212,6 +5202,16 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>Rena&amp;me Variable...	F2</source>
         <translation>変数名の変更(&amp;M)...	F2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
+        <source>No text has been looked for yet.</source>
+        <translation>まだテキストを検索していません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
+        <source>&amp;Find and Replace...	Ctrl+F</source>
+        <translation>検索と置換(&amp;F)...	Ctrl+F</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>

@@ -1,6 +1,7 @@
 #include "OpenedTemplate.h"
 
 #include "CommandList.h"
+#include "HelpWindow.h"
 #include "Session.h"
 #include "TemplateFindBar.h"
 
@@ -11,6 +12,7 @@
 #include <QPushButton>
 #include <QStatusBar>
 #include <QTimer>
+#include <QToolBar>
 #include <QUrl>
 
 #include <gtest/gtest.h>
@@ -176,6 +178,56 @@ TEST(TemplateCommands, ACommandThatHasBecomePossibleDoesNotMissItsKey)
     QTest::keyClick(&opened.window->edit(), Qt::Key_S, Qt::ControlModifier);
     EXPECT_FALSE(opened.window->isWindowModified());
     EXPECT_TRUE(opened.folder.bytesOf("t.xml").contains("<Label>North2"));
+}
+
+TEST(TemplateCommands, TheDailyOnesHaveButtonsThatShowWhatTheyCanDo)
+{
+    OpenedTemplate opened;
+    const auto *bar = opened.window->findChild<QToolBar *>();
+    ASSERT_NE(bar, nullptr);
+    int buttons = 0;
+    for (QAction *action : bar->actions()) {
+        if (action->isSeparator()) {
+            continue;
+        }
+        ++buttons;
+        EXPECT_FALSE(action->icon().isNull()) << action->text().toStdString();
+        EXPECT_FALSE(bar->widgetForAction(action)->accessibleName().isEmpty());
+        EXPECT_TRUE(action->toolTip().contains(action->shortcut().toString(QKeySequence::NativeText)))
+            << action->toolTip().toStdString();
+    }
+    EXPECT_GE(buttons, 11);
+    const auto isOn = [&](const char *name) {
+        for (QAction *action : bar->actions()) {
+            const QWidget *button = bar->widgetForAction(action);
+            if (button->accessibleName() == QString::fromUtf8(name)) {
+                return button->isEnabled();
+            }
+        }
+        ADD_FAILURE() << name;
+        return false;
+    };
+    EXPECT_FALSE(isOn("Save"));
+    EXPECT_FALSE(isOn("Undo"));
+    opened.putAfter("<Label>North");
+    EXPECT_FALSE(isOn("Cut"));
+    opened.type("2");
+    EXPECT_TRUE(isOn("Save")) << "without any menu";
+    EXPECT_TRUE(isOn("Undo"));
+    opened.window->edit().selectAll();
+    EXPECT_TRUE(isOn("Cut"));
+    opened.window->edit().undo();
+    EXPECT_FALSE(isOn("Save"));
+}
+
+TEST(TemplateCommands, HelpIsTheGuideOfTemplates)
+{
+    OpenedTemplate opened;
+    opened.choose("Help");
+    auto *help = dynamic_cast<kareport::HelpWindow *>(opened.window->findChild<QDialog *>());
+    ASSERT_NE(help, nullptr);
+    EXPECT_TRUE(help->isVisible());
+    EXPECT_EQ(help->browser().source().fileName(), QStringLiteral("guide-templates.md"));
 }
 
 TEST(TemplateCommands, ReasonsAreSaidInTheirOwnWindow)

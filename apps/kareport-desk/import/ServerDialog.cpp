@@ -33,6 +33,7 @@ ServerDialog::ServerDialog(const QString &connection, QWidget *parent)
 {
     setWindowTitle(Xlate("Tables of a PostgreSQL Server"));
     setWindowFlag(Qt::WindowContextHelpButtonHint, false);
+    setProperty("guidePlace", QStringLiteral("guide-desk.md#databases"));
     auto *form = new QFormLayout;
     const auto addRow = [form](const QString &text, const QString &name, QLineEdit *field, const QString &example) {
         auto *label = plainLabel(text);

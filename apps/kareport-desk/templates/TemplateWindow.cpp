@@ -9,6 +9,7 @@
 #include "TextDifference.h"
 #include "Xlate.h"
 
+#include <QApplication>
 #include <QComboBox>
 #include <QLabel>
 #include <QStatusBar>
@@ -87,8 +88,10 @@ TemplateWindow::TemplateWindow()
 
 TemplateWindow::~TemplateWindow()
 {
-    // The texts tell of changes until they are gone.
+    // The texts tell of changes until they are gone, and the program of the keyboard.
     edit_->disconnect(this);
+    page_->disconnect(this);
+    qApp->disconnect(this);
     worker_.reset();
 }
 

@@ -22,6 +22,7 @@ class QComboBox;
 class QLabel;
 class QMenu;
 class QPlainTextEdit;
+class QToolBar;
 class QTreeWidget;
 
 namespace kareport
@@ -84,7 +85,10 @@ private:
 
     // TemplateWindowMenus.cpp
     void makeMenus();
-    void addCommand(QMenu &menu, const QString &text, std::function<void()> act, std::function<QString()> whyNot = {});
+    void addHelpMenu();
+    void addFindCommands(QMenu &menu);
+    void addCommand(QMenu &menu, const QString &text, std::function<void()> act, std::function<QString()> whyNot = {},
+                    unsigned likeCommand = 0);
     void chooseCommand();
     QPlainTextEdit &readPart() const;
     QString whyNoEdit() const;
@@ -139,6 +143,7 @@ private:
     QLabel *place_ = nullptr;
     QLabel *templateName_ = nullptr;
     QComboBox *dataChoice_ = nullptr;
+    QToolBar *toolBar_ = nullptr;
     QTimer workingTimer_;
     FileWatch watch_;
     FileWatch dataWatch_;
