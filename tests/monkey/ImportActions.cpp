@@ -32,7 +32,7 @@ const QStringList &dataNames()
     return names;
 }
 
-void putFile(const QString &path, const QByteArray &content)
+void writeData(const QString &path, const QByteArray &content)
 {
     QFile file(path);
     if (file.open(QIODevice::WriteOnly)) {
@@ -123,11 +123,11 @@ void makePoints(const World &world)
         return;
     }
     world.folder().mkpath(QStringLiteral("data"));
-    putFile(data.filePath(QStringLiteral("points.xml")), pointsTemplate());
-    putFile(data.filePath(QStringLiteral("points.csv")), "Number,Northing,Easting,Height\n1,2.5,3,4\n2,3.5,4,5\n");
-    putFile(data.filePath(QStringLiteral("points.txt")), "Pt;N;E\nA1;1000,5;3\nA2;2000,25;4\n");
-    putFile(data.filePath(QStringLiteral("bare.txt")), "7|0.5|1\n8|2|3\n");
-    putFile(data.filePath(QStringLiteral("wrong.csv")), "Number,Northing,Easting\n1,abc,3\n2,4\n");
+    writeData(data.filePath(QStringLiteral("points.xml")), pointsTemplate());
+    writeData(data.filePath(QStringLiteral("points.csv")), "Number,Northing,Easting,Height\n1,2.5,3,4\n2,3.5,4,5\n");
+    writeData(data.filePath(QStringLiteral("points.txt")), "Pt;N;E\nA1;1000,5;3\nA2;2000,25;4\n");
+    writeData(data.filePath(QStringLiteral("bare.txt")), "7|0.5|1\n8|2|3\n");
+    writeData(data.filePath(QStringLiteral("wrong.csv")), "Number,Northing,Easting\n1,abc,3\n2,4\n");
     makeDatabase(data.filePath(QStringLiteral("points.sqlite")));
 }
 
@@ -175,7 +175,7 @@ void changeData(World &world, Chance &chance)
     world.did = QString::number(rows.count('\n')) + QStringLiteral(" lines");
     const qint64 limit = fileLimit();
     limitFiles(-1);
-    putFile(dataOf(world).filePath(QStringLiteral("points.csv")), rows);
+    writeData(dataOf(world).filePath(QStringLiteral("points.csv")), rows);
     limitFiles(limit);
     constexpr int seenAfter = 1300; // milliseconds
     world.wait(seenAfter);

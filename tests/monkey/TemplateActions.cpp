@@ -66,7 +66,7 @@ void find(TemplateWindow &window, Chance &chance)
 }
 
 /// Runs a command that can act; each says so or why not, and one that inserts something does.
-void runCommand(World &world, TemplateWindow &window, Chance &chance)
+void runTemplateCommand(World &world, TemplateWindow &window, Chance &chance)
 {
     window.updateCommands();
     std::vector<ListedCommand> commands;
@@ -93,7 +93,7 @@ void runCommand(World &world, TemplateWindow &window, Chance &chance)
     }
 }
 
-void save(World &world, TemplateWindow &window)
+void saveTemplate(World &world, TemplateWindow &window)
 {
     if (!window.save() || fileLimit() >= 0) {
         return;
@@ -127,12 +127,12 @@ void editTemplate(World &world, Chance &chance)
         } else if (chance.oneIn(6)) {
             find(*window, chance);
         } else {
-            runCommand(world, *window, chance);
+            runTemplateCommand(world, *window, chance);
         }
         QCoreApplication::processEvents();
     }
     if (chance.oneIn(4)) {
-        save(world, *window);
+        saveTemplate(world, *window);
     }
     if (chance.oneIn(2)) {
         window->close();
