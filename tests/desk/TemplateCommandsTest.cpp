@@ -148,8 +148,8 @@ TEST(TemplateCommands, EveryCommandThatIsDisabledSaysWhy)
 
 TEST(TemplateCommands, ATemplateThatCanOnlyBeReadStaysAsItIs)
 {
-    // A character of a text that ends a line of its own in a window.
-    OpenedTemplate opened(controlTemplates().replace("<Label>North", "<Label>N\xE2\x80\xA9orth"));
+    // A character that the text of a window keeps for itself.
+    OpenedTemplate opened(controlTemplates().replace("<Label>North", "<Label>N\xEF\xB7\x90orth"));
     ASSERT_TRUE(opened.window->edit().isReadOnly());
     const QString before = opened.text();
     opened.putAfter("<VariableName>North");
