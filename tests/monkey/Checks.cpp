@@ -121,6 +121,9 @@ QString World::checkClosed() const
     });
     for (const Seen &gone : closed_) {
         const Seen *was = seen(gone.id);
+        if (was == nullptr && mayChange.count(gone.report) == 0) {
+            continue; // the report of a job that went wrong has come and gone
+        }
         const bool hadChanges = gone.isModified || (was != nullptr && was->isModified);
         if (!hadChanges || gone.text.isEmpty() || isKept(gone.text)) {
             continue;
