@@ -1,4 +1,4 @@
-#include "Profile.h"
+#include "BenchProfile.h"
 
 #include <QApplication>
 
@@ -11,7 +11,7 @@ int main(int argc, char *argv[])
 {
     qputenv("QT_QPA_PLATFORM", "offscreen");
     const QApplication application(argc, argv);
-    kareport::setProfileStore(kareport::makeMemoryProfile()); // no figure depends on the user's settings
+    kareport::useBenchProfile();
     benchmark::Initialize(&argc, argv);
     if (benchmark::ReportUnrecognizedArguments(argc, argv)) {
         return 1;

@@ -1,7 +1,6 @@
 #include "CompressedFaces.h"
 #include "PdfExport.h"
 #include "ProcessorTime.h"
-#include "Profile.h"
 #include "UReportDoc.h"
 
 #include <QBuffer>
@@ -55,7 +54,6 @@ BENCHMARK(pdfPages)->Arg(100)->Arg(1000)->Arg(10'000)->Unit(benchmark::kMillisec
 /// A page, in a process that has written such a page before: with the face that was kept of it, or without.
 void pdfOfOnePage(benchmark::State &state)
 {
-    kareport::setProfileStore(kareport::makeMemoryProfile());
     UReportDoc report;
     report.FixPage(72, 80);
     report.SetPageSize();

@@ -1,9 +1,9 @@
 // The desktop program up to its first painted window: timed as a whole process.
+#include "BenchProfile.h"
 #include "DeskApplication.h"
 #include "DeskFrame.h"
 #include "DeskPreferences.h"
 #include "Language.h"
-#include "Profile.h"
 
 #include <QApplication>
 #include <QPaintEvent>
@@ -30,7 +30,7 @@ int main(int argc, char **argv)
 {
     QApplication application(argc, argv);
     QApplication::setApplicationName(QStringLiteral("KaReport"));
-    kareport::setProfileStore(kareport::makeMemoryProfile());
+    kareport::useBenchProfile();
     kareport::setLanguage(kareport::loadPreferences().language);
     FirstPaint firstPaint;
     application.installEventFilter(&firstPaint);

@@ -8,8 +8,8 @@
 //
 // Prints the seconds and the peak memory of the process in KB.
 
+#include "BenchProfile.h"
 #include "ProcessorTime.h"
-#include "Profile.h"
 #include "ReplaceFile.h"
 #include "UReportDoc.h"
 
@@ -61,7 +61,7 @@ QByteArray contentOf(const char *path)
 
 int main(int argc, char **argv)
 {
-    kareport::setProfileStore(kareport::makeMemoryProfile());
+    kareport::useBenchProfile();
     const QByteArrayView verb(argc > 1 ? argv[1] : "");
     UReportDoc report;
     if (verb == QByteArrayView("save") && argc == 4) {

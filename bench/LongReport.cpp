@@ -4,10 +4,10 @@
 //   ka_long_report FILE              the report file FILE is opened
 //   ka_long_report FILE --bare       the text FILE in the bare control
 //   ka_long_report FILE --view-edit  a report that was made of the lines of FILE is opened by View\Edit Report
+#include "BenchProfile.h"
 #include "DeskApplication.h"
 #include "DeskFrame.h"
 #include "ProcessorTime.h"
-#include "Profile.h"
 #include "ReportEdit.h"
 #include "ReportEntry.h"
 #include "ReportWindowEntry.h"
@@ -111,7 +111,7 @@ int main(int argc, char **argv)
 {
     QApplication application(argc, argv);
     QApplication::setApplicationName(QStringLiteral("KaReport"));
-    kareport::setProfileStore(kareport::makeMemoryProfile());
+    kareport::useBenchProfile();
     const QStringList arguments = QApplication::arguments();
     if (arguments.size() < 2) {
         std::fprintf(stderr, "ka_long_report FILE [--bare | --view-edit]\n");

@@ -1,8 +1,8 @@
 // How long it takes from a key in a template's editor to the repainted first page, with many rows of data.
+#include "BenchProfile.h"
 #include "DeskApplication.h"
 #include "DeskFrame.h"
 #include "OpenTemplate.h"
-#include "Profile.h"
 #include "TemplatePage.h"
 #include "TemplateTextEdit.h"
 #include "TemplateWindow.h"
@@ -118,7 +118,7 @@ int main(int argc, char **argv)
 {
     QApplication application(argc, argv);
     QStandardPaths::setTestModeEnabled(true);
-    kareport::setProfileStore(kareport::makeMemoryProfile());
+    kareport::useBenchProfile();
     constexpr int usualRows = 1'000'000;
     const int rows = argc > 2 ? std::atoi(argv[2]) : usualRows;
     if (argc < 2) {

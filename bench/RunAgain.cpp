@@ -2,10 +2,10 @@
 // it.
 //
 //   ka_run_again [ROWS]    100,000 rows unless it is said; prints milliseconds, one line a time
+#include "BenchProfile.h"
 #include "DeskApplication.h"
 #include "DeskFrame.h"
 #include "DeskRuns.h"
-#include "Profile.h"
 #include "ReportEdit.h"
 #include "ReportEntry.h"
 #include "UReportDoc.h"
@@ -95,7 +95,7 @@ int main(int argc, char **argv)
 {
     QApplication application(argc, argv);
     QApplication::setApplicationName(QStringLiteral("KaReport"));
-    kareport::setProfileStore(kareport::makeMemoryProfile());
+    kareport::useBenchProfile();
     const int count = argc > 1 ? QByteArray(argv[1]).toInt() : 100'000;
     const QTemporaryDir folder;
     const QString job = folder.filePath(QStringLiteral("job.json"));

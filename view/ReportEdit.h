@@ -41,6 +41,8 @@ public:
     bool isLoading() const { return loader_ != nullptr; }
     /// How much of the text has been loaded.
     int loadedPercent() const { return loader_ ? loader_->percent() : 100; }
+    /// Sets how often the window follows a text that is being loaded, in milliseconds; at the end it always does.
+    void setFollowInterval(qint64 milliseconds) { followInterval_ = milliseconds; }
     /// Loads at once what is missing.
     void finishLoading();
     /// Leaves the missing part out.
@@ -155,6 +157,7 @@ private:
     Place wanted_ = {};                ///< where the window was before, which may not have been loaded yet
     int waiting_ = 0;                  ///< the cursor's position until then
     bool isScrolled_ = false;          ///< by the user, since loading began
+    qint64 followInterval_ = 200;      ///< a few times a second: painting takes longer than loading a piece
     QElapsedTimer sinceShown_;         ///< since the window was last notified of a piece
     bool isFollowing_ = false;
     int length_ = 0;

@@ -74,8 +74,7 @@ void ReportEdit::loadPiece()
     const int anchor = textCursor().anchor();
     {
         // Every piece would paint the whole window and move the scroll bar: a few times a second is enough.
-        constexpr qint64 showInterval = 200; // milliseconds
-        const bool isShown = sinceShown_.elapsed() >= showInterval;
+        const bool isShown = sinceShown_.elapsed() >= followInterval_;
         QSignalBlocker blocker(document()->documentLayout());
         if (isShown || loader_->isLastPiece()) {
             blocker.unblock();

@@ -1,6 +1,7 @@
 #include "TableDesk.h"
 
 #include "DeskCommandIds.h"
+#include "FileWatch.h"
 #include "Interrupt.h"
 #include "NotesPane.h"
 #include "UReportList.h"
@@ -20,6 +21,21 @@ namespace
 {
 
 using kareport::runAgainCommand;
+
+/// Waits until a watch that begins now has reported a change: those that began earlier have reported what changed before.
+void waitForWatches(const QString &folder)
+{
+    QFile witness(folder + QStringLiteral("/witness"));
+    ASSERT_TRUE(witness.open(QIODevice::WriteOnly));
+    int reports = 0;
+    kareport::FileWatch watch([&reports](const QString & /*path*/) { ++reports; });
+    watch.watch(witness.fileName());
+    for (int change = 1; change <= 2; ++change) { // the moments of two watches may differ a little
+        witness.write("changed");
+        witness.flush();
+        EXPECT_TRUE(QTest::qWaitFor([&reports, change] { return reports == change; }));
+    }
+}
 
 /// Puts the cursor into a line, with a selection that begins in another one.
 void select(kareport::ReportEdit &edit, int fromLine, int fromColumn, int line, int column)
@@ -199,7 +215,7 @@ TEST(RunAgain, AReportMayBeClosedWhileItIsMade)
     EXPECT_TRUE(desk.messages.isEmpty());
     EXPECT_FALSE(desk.isEnabled(runAgainCommand));
     desk.putRows(1);
-    QTest::qWait(700);
+    waitForWatches(desk.folder.path());
     EXPECT_TRUE(Desk::reports().empty()) << "its files are not looked at any more";
 }
 
@@ -223,8 +239,8 @@ TEST(RunAgain, AReportWindowShowsTheLinesOfTheNewRun)
     EXPECT_EQ(first.filter(QStringLiteral("51.000")).size(), 1);
     EXPECT_EQ(first.filter(QStringLiteral("0.000")).size(), 1) << "those of the first run are gone";
     EXPECT_EQ(window->GetList()->model()->rowCount(), window->GetList()->GetCount()) << "they are shown at once";
-    QTest::qWait(100);
-    EXPECT_EQ(window->GetList()->currentIndex().row(), window->GetList()->GetCurSel());
+    EXPECT_TRUE(
+        QTest::qWaitFor([list = window->GetList()] { return list->currentIndex().row() == list->GetCurSel(); }));
 }
 
 TEST(RunAgain, TheTitleFollowsTheJobUnlessTheReportHasAFile)
@@ -267,8 +283,13 @@ public:
     explicit FollowingDesk(bool follows = true)
     {
         frame->runs().setFollowsFiles(follows);
+        // A change within the precision of a file's time would look like none.
+        for (const QString &name : QDir(folder.path()).entryList(QDir::Files)) {
+            QFile file(folder.path(qPrintable(name)));
+            EXPECT_TRUE(file.open(QIODevice::ReadWrite) &&
+                        file.setFileTime(QDateTime::currentDateTime().addSecs(-60), QFileDevice::FileModificationTime));
+        }
         report = open();
-        QTest::qWait(20); // changes within the precision of a file's time would look like none
     }
     bool comesTo(const QStringList &values) const
     {
@@ -323,7 +344,7 @@ TEST(RunAgain, AFileThatIsCutOffOrGoneLeavesTheReport)
     EXPECT_TRUE(desk.comesTo({"7.000"}));
     EXPECT_EQ(pane.count(), 0) << "the list empties with the next run";
     QFile::remove(desk.folder.path("p.csv"));
-    QTest::qWait(700);
+    waitForWatches(desk.folder.path());
     EXPECT_EQ(TableDesk::northings(*desk.report), QStringList{"7.000"});
     desk.putRows(1, 8);
     EXPECT_TRUE(desk.comesTo({"8.000"})) << "it is back";
@@ -341,7 +362,7 @@ TEST(RunAgain, WithoutFollowingTheUserIsToldAlone)
     EXPECT_TRUE(desk.comesTo({"7.000"})) << "what has changed already counts";
     EXPECT_TRUE(desk.frame->OnCommand(kareport::runWhenChangedCommand));
     desk.putRows(1, 8);
-    QTest::qWait(700);
+    waitForWatches(desk.folder.path());
     EXPECT_EQ(TableDesk::northings(*desk.report), QStringList{"7.000"});
 }
 
@@ -379,7 +400,6 @@ TEST(RunAgain, AChangeWhileTheReportIsMadeIsNoticed)
 {
     FollowingDesk desk;
     ASSERT_NE(desk.report, nullptr);
-    QTest::qWait(20);
     duringRun([&desk] { desk.folder.put("p.csv", TableDesk::rows(2, 4)); });
     desk.frame->runs().runAgain();
     EXPECT_TRUE(desk.comesTo({"4.000", "5.000"}));

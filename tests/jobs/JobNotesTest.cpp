@@ -10,8 +10,6 @@
 
 #include <gtest/gtest.h>
 
-#include <ctime>
-
 namespace
 {
 
@@ -422,74 +420,6 @@ TEST(JobNotes, APlaceIsFoundFarBehind)
     ASSERT_TRUE(job.notes.said().front().dataPlace);
     EXPECT_EQ(job.notes.said().front().dataPlace->line, 25'002);
     EXPECT_EQ(job.notes.said().front().dataPlace->column, 7);
-}
-
-/// The processor's time for a job whose template has many variables and fields that no column fills.
-double timeOfNotes(int count)
-{
-    using namespace markup;
-    std::vector<QByteArray> fields;
-    std::vector<QByteArray> variables;
-    QByteArray header = "Number";
-    for (int i = 0; i < count; ++i) {
-        const QByteArray number = QByteArray::number(i);
-        fields.push_back(field(("Field" + number).constData(), "x", "5"));
-        fields.push_back(field(("Lost" + number).constData(), "x", "5"));
-        variables.push_back(variable(i + 2, ("Field" + number).constData(), "LENGTH"));
-        header += ",Column" + number;
-    }
-    variables.push_back(variable(1, "Number", "TEXT"));
-    TestJob job;
-    job.folder.put(
-        "t.xml",
-        element("ReportTemplate",
-                element("Name", "T") + element("Title", "t") +
-                    element("Tables", output("Table", "Points", "D", fields)) +
-                    element("Dictionaries", element("Dictionary", element("DictionaryName", "D") +
-                                                                      element("VariableList", joined(variables))))));
-    job.folder.put("p.csv", header + "\n");
-    QByteArray steps = tableStep;
-    for (int i = 0; i < count; ++i) {
-        steps += R"(, {"line": "x"})";
-    }
-    const std::clock_t before = std::clock();
-    job.run(templateJob(R"("p": {"csv": "p.csv"})", steps));
-    EXPECT_FALSE(job.error) << job.text().toStdString();
-    EXPECT_GE(job.notes.said().size(), static_cast<std::size_t>(2 * count));
-    return static_cast<double>(std::clock() - before) / CLOCKS_PER_SEC;
-}
-
-TEST(JobNotes, TakeTimeInProportion)
-{
-    const double few = timeOfNotes(400);
-    const double many = timeOfNotes(4000);
-    EXPECT_LT(many, 40 * few + 0.2) << "ten times as many: " << few << " s and " << many << " s";
-}
-
-/// The same for a job of many steps, each of which has something to note.
-double timeOfSteps(int count)
-{
-    TestJob job;
-    job.folder.put("p.csv", "Number,Northing\n1,\n");
-    QByteArray steps;
-    QByteArray sets;
-    for (int i = 0; i < count; ++i) {
-        const QByteArray name = QByteArray::number(i);
-        sets += QByteArray(i > 0 ? ", " : "") + "\"p" + name + R"(": {"csv": "p.csv"})";
-        steps += QByteArray(i > 0 ? ", " : "") + R"({"table": "Points", "data": "p)" + name + "\"}";
-    }
-    const std::clock_t before = std::clock();
-    job.run(templateJob(sets, steps));
-    EXPECT_FALSE(job.error) << job.text().toStdString();
-    EXPECT_EQ(job.notes.said().size(), static_cast<std::size_t>(count));
-    return static_cast<double>(std::clock() - before) / CLOCKS_PER_SEC;
-}
-
-TEST(JobNotes, OfManyStepsTakeTimeInProportion)
-{
-    const double few = timeOfSteps(300);
-    const double many = timeOfSteps(3000);
-    EXPECT_LT(many, 30 * few + 0.2) << "ten times as many: " << few << " s and " << many << " s";
 }
 
 TEST(JobNotes, AreErrorsInAStrictJob)

@@ -1,7 +1,6 @@
 #include "CommandLine.h"
 
 #include <QDir>
-#include <QElapsedTimer>
 
 #include <gtest/gtest.h>
 
@@ -9,8 +8,6 @@
 
 namespace
 {
-
-constexpr qint64 longest = 5000; ///< milliseconds that a file that is wrong may take
 
 /// A job that lists points, or something else, of a file.
 QByteArray jobOf(const QByteArray &file, const QByteArray &list = "points")
@@ -116,10 +113,7 @@ TEST_F(CommandLineLandXml, AFileThatIsWrongEndsWithStatusTwoAndOneSentence)
     for (const Row &row : rows) {
         folder.put("road.xml", row.content);
         folder.put("job.json", jobOf("road.xml", row.list));
-        QElapsedTimer time;
-        time.start();
         const ProgramRun run = folder.run("render job.json");
-        EXPECT_LT(time.elapsed(), longest) << row.says;
         EXPECT_EQ(run.status, 2) << row.says << "\n" << run.all().left(2000).constData();
         EXPECT_EQ(run.out, "") << row.says;
         EXPECT_EQ(run.err.count("error: "), 1) << row.says << "\n" << run.err.left(2000).constData();
