@@ -52,9 +52,11 @@ public:
     /// @param owner           the host document that asked for the report, notified when it is deleted; null for none. It is not
     ///                        owned and must outlive the report
     UReportDoc(const QString &name, bool externalEditor, bool closeDocument, UDocument *owner);
+    /// A report without a name, for the user's own view.
     UReportDoc();
     /// A report with surroundings of its own, which apply until others are set.
     explicit UReportDoc(const kareport::ReportSurroundings &surroundings);
+    /// Destroys the report window as well.
     ~UReportDoc() override;
 
     /// Whether a pointer is a report that is still alive.
@@ -386,8 +388,13 @@ public:
 
     // --- Opening: UReportDocOpen.cpp --------------------------------------------------------------------------------
 
+    /// Begins an empty report: its page is measured. @return false when the base class fails
     bool OnNewDocument() override;
+    /// Reads a file into the report. A name with ".rtf" in it makes the report one that was opened from rich text.
+    /// @return false when the file cannot be read
     bool OnOpenDocument(const QString &path) override;
+    /// Writes into an archive, or reads a file from one. What is written is the first half of the text in UTF-16: as many bytes
+    /// as the text has characters, which is the length that readers of such archives expect.
     void Serialize(UArchive &archive) override;
     /// Reads a report file, or a rich-text file, at the end of what the report holds.
     /// @param keepLineEnds  whether the lines keep their own line ends before the one that each of them gets
@@ -411,8 +418,13 @@ public:
 
     // --- Closing: UReportDocClose.cpp -------------------------------------------------------------------------------
 
+    /// Whether a pane of the report may be closed; false while `SetCanClose` forbids it. The last pane asks whether changes are
+    /// saved.
     bool CanCloseFrame(CViewPane *pane) override;
+    /// Closes the report without asking, with its panes and its report window. Nothing happens while a report with a report
+    /// window has its closing deferred.
     void OnCloseDocument() override;
+    /// Notifies the owner that the report is being deleted.
     void OnAutoDelete() override;
     /// Closes the report at once or, when closing has been deferred, asks for it: the next call closes.
     void CloseReportDocument();

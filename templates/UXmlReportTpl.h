@@ -30,7 +30,9 @@ class ScanText;
 class KAREPORT_EXPORT UXmlReportTpl
 {
 public:
+    /// Holds no template until one is loaded.
     UXmlReportTpl();
+    /// Destroys the records that were handed out.
     ~UXmlReportTpl();
     UXmlReportTpl(const UXmlReportTpl &) = delete;
     UXmlReportTpl &operator=(const UXmlReportTpl &) = delete;

@@ -25,10 +25,10 @@ public:
     /// What a scroll bar asks for.
     enum ScrollCode : unsigned
     {
-        lineBack = 0,
-        lineForward = 1,
-        thumbPosition = 4,
-        thumbTrack = 5
+        lineBack = 0,      ///< one step up or left
+        lineForward = 1,   ///< one step down or right
+        thumbPosition = 4, ///< to where the thumb was released
+        thumbTrack = 5     ///< to where the thumb is while it is dragged
     };
 
     /// A list without lines, which `Create` gives its place. @param parent  owns it; may be null
@@ -81,13 +81,16 @@ public:
 
     // --- View -------------------------------------------------------------------------------------------------------
 
-    ///@{
-    /// As those of `QListView`, worked out from the one height that all rows have.
+    // As those of `QListView`, worked out from the one height that all rows have.
+
+    /// Where the row of an index is, in coordinates of the viewport; an empty rectangle for an invalid index.
     QRect visualRect(const QModelIndex &index) const override;
+    /// The row at a point of the viewport; an invalid index below the last one.
     QModelIndex indexAt(const QPoint &point) const override;
+    /// Scrolls until the row of an index is seen.
     void scrollTo(const QModelIndex &index, ScrollHint hint = EnsureVisible) override;
+    /// Lays the rows out again.
     void doItemsLayout() override;
-    ///@}
 
 protected:
     ///@{

@@ -12,7 +12,9 @@
 class KAREPORT_EXPORT UDataObjectList
 {
 public:
+    /// An empty list.
     UDataObjectList();
+    /// Destroys the objects with the list.
     virtual ~UDataObjectList();
     UDataObjectList(const UDataObjectList &) = delete;
     UDataObjectList &operator=(const UDataObjectList &) = delete;

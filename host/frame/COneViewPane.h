@@ -21,19 +21,22 @@ public:
     /// How the caption is shown.
     enum CaptionState
     {
-        captionPlain = 0,
-        captionHighlighted = 2
+        captionPlain = 0,      ///< as the captions of other docked windows
+        captionHighlighted = 2 ///< marked, so that it stands out among the others
     };
 
     COneViewPane();
     ~COneViewPane() override;
 
+    /// Takes a view into the pane, which owns it, and shows its widget in place of the one before.
     void AddView(std::unique_ptr<UView> view) override;
     /// Docks the pane in the main frame, or leaves it a window of its own where there is none.
     void SetPlace(CViewPane *parent, unsigned style, const QRect *rect) override;
+    /// Shows the caption in the title of the dock widget.
     void UpdateTitle() override;
     /// Whether the pane is open, also as a tab that another one hides.
     bool IsVisible() const override;
+    /// Whether the pane is open and no other tab covers it.
     bool IsInFront() const override;
     /// Shows the pane and brings it to the front, or hides it.
     void ShowPane(bool show) override;

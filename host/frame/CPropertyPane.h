@@ -7,9 +7,12 @@
 class KAREPORT_EXPORT CPropertyPane : public COneViewPane
 {
 public:
+    /// Makes the pane known, so that it is told of changed documents.
     CPropertyPane();
+    /// Takes the pane out of those that are told.
     ~CPropertyPane() override;
 
+    /// False: the caption is the pane's own.
     bool HasDocumentTitle() const override { return false; }
 
     /// Called when a document has changed; with null for one that has closed since.

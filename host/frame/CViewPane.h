@@ -22,7 +22,9 @@ class CommandTarget;
 class KAREPORT_EXPORT CViewPane
 {
 public:
+    /// A pane without a view, which is not open yet.
     CViewPane();
+    /// Destroys the views with the pane.
     virtual ~CViewPane();
     CViewPane(const CViewPane &) = delete;
     CViewPane &operator=(const CViewPane &) = delete;

@@ -13,7 +13,9 @@
 class KAREPORT_EXPORT UApplication
 {
 public:
+    /// Becomes the application that `Get` returns.
     UApplication();
+    /// Closes all documents without asking and destroys the templates; `Get` then returns null.
     virtual ~UApplication();
     UApplication(const UApplication &) = delete;
     UApplication &operator=(const UApplication &) = delete;

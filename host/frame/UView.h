@@ -15,7 +15,9 @@ class XInput;
 class KAREPORT_EXPORT UView
 {
 public:
+    /// A view that is in no pane and shows no document yet.
     UView();
+    /// Takes the view out of its document and of what the application and the frame remember.
     virtual ~UView();
     UView(const UView &) = delete;
     UView &operator=(const UView &) = delete;

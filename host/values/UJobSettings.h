@@ -45,6 +45,7 @@ struct StationForm
 class KAREPORT_EXPORT UJobSettings
 {
 public:
+    /// Where a station has its plus sign.
     enum class StationFormat
     {
         Plain,        ///< 12345.678
@@ -52,21 +53,21 @@ public:
         ThousandsPlus ///< 12+345.678
     };
 
-    kareport::LengthUnit lengthUnit = kareport::LengthUnit::Metre;
-    kareport::AreaUnit areaUnit = kareport::AreaUnit::SquareMetre;
-    kareport::AngleUnit angleUnit = kareport::AngleUnit::Degree;
-    int lengthDecimals = 3;  ///< of lengths, 0 to 15
-    int stationDecimals = 3; ///< of stations, 0 to 15
-    int numberDecimals = 3;  ///< of plain numbers and areas, 0 to 15
-    StationFormat stationFormat = StationFormat::ThousandsPlus;
+    kareport::LengthUnit lengthUnit = kareport::LengthUnit::Metre; ///< that lengths are shown in
+    kareport::AreaUnit areaUnit = kareport::AreaUnit::SquareMetre; ///< that areas are shown in
+    kareport::AngleUnit angleUnit = kareport::AngleUnit::Degree;   ///< that angles are shown in, but not bearings
+    int lengthDecimals = 3;                                        ///< of lengths, 0 to 15
+    int stationDecimals = 3;                                       ///< of stations, 0 to 15
+    int numberDecimals = 3;                                        ///< of plain numbers and areas, 0 to 15
+    StationFormat stationFormat = StationFormat::ThousandsPlus;    ///< where stations have their plus sign
     qint16 northEastOrder = 1; ///< 1 northing before easting, 0 easting before northing
 
     // The five values that a `UFormatBearing` is made of; their codes are given there.
-    unsigned bearingUnit = 0;
-    qint16 bearingStyle = 1;
-    qint32 bearingDecimals = 0;
-    qint16 bearingPadding = 1;
-    unsigned bearingReference = 0;
+    unsigned bearingUnit = 0;      ///< degrees, minutes and seconds; decimal degrees; or gon
+    qint16 bearingStyle = 1;       ///< whole circle or quadrant
+    qint32 bearingDecimals = 0;    ///< of the smallest unit shown
+    qint16 bearingPadding = 1;     ///< whether whole degrees or gon are padded with zeros
+    unsigned bearingReference = 0; ///< counted from north or from south
 
     /// Degree, minute and second mark, Latin-1; the character 0 shows no mark.
     std::array<char, 3> angleMarks = {'\xB0', '\'', '"'};
@@ -81,6 +82,7 @@ public:
     /// those of `kareport::LengthForm`.
     QString UnitLengthToString(double value, bool fromInternal, bool withUnit, int decimals, int width,
                                bool blankZero) const;
+    /// Appends the same text to a buffer. @throws std::bad_alloc when the buffer cannot grow
     void appendUnitLength(kareport::TextBuffer &out, double value, const kareport::LengthForm &form) const;
 
     /// A station (chainage), such as 12+345.678; "" when it is not finite. The arguments are those of
@@ -89,6 +91,7 @@ public:
     QString StationToString(double value, bool fromInternal, bool withUnit, bool plain, int decimals, int width,
                             bool withZone, bool withEquation, bool blankZero, bool alignRight, bool trimZeros,
                             bool showSign) const;
+    /// Appends the same text to a buffer. @throws std::bad_alloc when the buffer cannot grow
     void appendStation(kareport::TextBuffer &out, double value, const kareport::StationForm &form) const;
 
 private:
