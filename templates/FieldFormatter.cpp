@@ -1,10 +1,9 @@
 #include "FieldFormatter.h"
 
+#include "BearingText.h"
 #include "FixedNotation.h"
 #include "Is_Zero.h"
 #include "TextFolding.h"
-#include "UFormatAngle.h"
-#include "UFormatBearing.h"
 #include "UPointNumber.h"
 #include "VariableType.h"
 
@@ -141,15 +140,7 @@ void FieldFormatter::appendValue(TextBuffer &out, const FormatOptions &options, 
 {
     const UJobSettings &settings = *options.settings;
     const bool finite = std::isfinite(input.number);
-    const auto blankForZero = [&](bool isZero) {
-        if (!options.zeroBlank || !isZero) {
-            return false;
-        }
-        const std::size_t start = out.size();
-        out.append(u' ');
-        out.pad(start, width_);
-        return true;
-    };
+    const auto blankForZero = [&](bool isZero) { return options.zeroBlank && isZero && appendBlanks(out); };
 
     switch (type_) {
     case VARIABLE_INTEGER:
@@ -174,7 +165,7 @@ void FieldFormatter::appendValue(TextBuffer &out, const FormatOptions &options, 
         break;
     case VARIABLE_BEARING:
         if (finite && !blankForZero(input.number == 0)) {
-            appendBearing(out, settings, input.number);
+            out.append(bearingText(input.number, settings));
         }
         break;
     case VARIABLE_COORDINATE:
@@ -201,6 +192,15 @@ void FieldFormatter::appendValue(TextBuffer &out, const FormatOptions &options, 
     }
 }
 
+/// Fills the column. @return true
+bool FieldFormatter::appendBlanks(TextBuffer &out) const
+{
+    const std::size_t start = out.size();
+    out.append(u' ');
+    out.pad(start, width_);
+    return true;
+}
+
 /// Writes a number as C's printf does with "%*.*f": a zero keeps its minus sign.
 void FieldFormatter::appendNumber(TextBuffer &out, double value, int decimals) const
 {
@@ -218,20 +218,6 @@ void FieldFormatter::appendNumber(TextBuffer &out, double value, int decimals) c
         }
     }
     out.pad(start, width_);
-}
-
-void FieldFormatter::appendBearing(TextBuffer &out, const UJobSettings &settings, double value) const
-{
-    // What memory it takes is asked for here: the conversion answers with an empty text where there is none.
-    constexpr qsizetype longestBearing = 64;
-    QString text;
-    text.reserve(longestBearing);
-    UFormatBearing(settings.bearingUnit, settings.bearingStyle, settings.bearingDecimals, settings.bearingPadding,
-                   settings.bearingReference)
-        .ConvertToDisplayString(value, text);
-    UFormatAngle::ConvertToDMSformatString(settings.angleMarks[0], settings.angleMarks[1], settings.angleMarks[2],
-                                           text);
-    out.append(text);
 }
 
 void FieldFormatter::appendOffset(TextBuffer &out, const UJobSettings &settings, double value, bool withSign) const

@@ -65,8 +65,8 @@ private:
     struct Input;
 
     void appendValue(TextBuffer &out, const FormatOptions &options, const Input &input, QStringView suffix) const;
+    bool appendBlanks(TextBuffer &out) const;
     void appendNumber(TextBuffer &out, double value, int decimals) const;
-    void appendBearing(TextBuffer &out, const UJobSettings &settings, double value) const;
     void appendOffset(TextBuffer &out, const UJobSettings &settings, double value, bool withSign) const;
     void appendThickness(TextBuffer &out, double value) const;
     QStringView ownText(QStringView text) const;

@@ -66,45 +66,10 @@ PreferencesDialog::PreferencesDialog(const DeskPreferences &preferences, QWidget
     setWindowTitle(Xlate("Preferences"));
     setWindowFlag(Qt::WindowContextHelpButtonHint, false);
 
-    fontSize_->setRange(leastFontSize, mostFontSize);
-    fontSize_->setSuffix(Xlate(" pt"));
-    fontSize_->setValue(static_cast<int>(preferences.fontSize));
-    fontSize_->setAccessibleName(Xlate("Font size"));
-    auto *page = new QWidget;
-    auto *pageLayout = new QVBoxLayout(page);
-    auto *fontRow = new QFormLayout;
-    fontRow->setFieldGrowthPolicy(QFormLayout::FieldsStayAtSizeHint);
-    fontRow->addRow(Xlate("&Font size of new reports:"), fontSize_);
-    unit_->addItem(Xlate("Millimetres"), false);
-    unit_->addItem(Xlate("Inches"), true);
-    unit_->setCurrentIndex(preferences.inInches ? 1 : 0);
-    unit_->setAccessibleName(Xlate("Unit of margins"));
-    connect(unit_, &QComboBox::currentIndexChanged, page_,
-            [this] { page_->showInInches(unit_->currentData().toBool()); });
-    fontRow->addRow(Xlate("Unit of &margins:"), unit_);
-    pageLayout->addLayout(fontRow);
-    pageLayout->addWidget(page_);
-    pageLayout->addStretch();
-
-    language_->addItem(Xlate("As the system"), QString());
-    language_->addItem(QStringLiteral("English"), QStringLiteral("en"));
-    language_->addItem(QStringLiteral("Deutsch"), QStringLiteral("de"));
-    language_->addItem(QStringLiteral("日本語"), QStringLiteral("ja"));
-    language_->setCurrentIndex(qMax(0, language_->findData(preferences.language)));
-    language_->setAccessibleName(Xlate("Language"));
-    auto *program = new QWidget;
-    auto *programLayout = new QFormLayout(program);
-    programLayout->setFieldGrowthPolicy(QFormLayout::FieldsStayAtSizeHint);
-    programLayout->addRow(Xlate("&Language (from the next start):"), language_);
-    reportWindows_->setChecked(preferences.keepsReportWindows);
-    session_->setChecked(preferences.restoresSession);
-    programLayout->addRow(session_);
-    programLayout->addRow(reportWindows_);
-
     tabs_->addTab(units_, Xlate("&Units and Formats"));
-    tabs_->addTab(page, Xlate("&Page"));
+    tabs_->addTab(makePageTab(preferences), Xlate("&Page"));
     tabs_->addTab(editor_, Xlate("&Editor"));
-    tabs_->addTab(program, Xlate("Pro&gram"));
+    tabs_->addTab(makeProgramTab(preferences), Xlate("Pro&gram"));
 
     auto *layout = new QVBoxLayout(this);
     layout->addWidget(tabs_);
@@ -112,6 +77,51 @@ PreferencesDialog::PreferencesDialog(const DeskPreferences &preferences, QWidget
     connect(buttons, &QDialogButtonBox::accepted, this, &PreferencesDialog::accept);
     connect(buttons, &QDialogButtonBox::rejected, this, &PreferencesDialog::reject);
     layout->addWidget(buttons);
+}
+
+QWidget *PreferencesDialog::makePageTab(const DeskPreferences &preferences)
+{
+    fontSize_->setRange(leastFontSize, mostFontSize);
+    fontSize_->setSuffix(Xlate(" pt"));
+    fontSize_->setValue(static_cast<int>(preferences.fontSize));
+    fontSize_->setAccessibleName(Xlate("Font size"));
+    unit_->addItem(Xlate("Millimetres"), false);
+    unit_->addItem(Xlate("Inches"), true);
+    unit_->setCurrentIndex(preferences.inInches ? 1 : 0);
+    unit_->setAccessibleName(Xlate("Unit of margins"));
+    connect(unit_, &QComboBox::currentIndexChanged, page_,
+            [this] { page_->showInInches(unit_->currentData().toBool()); });
+
+    auto *tab = new QWidget;
+    auto *layout = new QVBoxLayout(tab);
+    auto *rows = new QFormLayout;
+    rows->setFieldGrowthPolicy(QFormLayout::FieldsStayAtSizeHint);
+    rows->addRow(Xlate("&Font size of new reports:"), fontSize_);
+    rows->addRow(Xlate("Unit of &margins:"), unit_);
+    layout->addLayout(rows);
+    layout->addWidget(page_);
+    layout->addStretch();
+    return tab;
+}
+
+QWidget *PreferencesDialog::makeProgramTab(const DeskPreferences &preferences)
+{
+    language_->addItem(Xlate("As the system"), QString());
+    language_->addItem(QStringLiteral("English"), QStringLiteral("en"));
+    language_->addItem(QStringLiteral("Deutsch"), QStringLiteral("de"));
+    language_->addItem(QStringLiteral("日本語"), QStringLiteral("ja"));
+    language_->setCurrentIndex(qMax(0, language_->findData(preferences.language)));
+    language_->setAccessibleName(Xlate("Language"));
+    reportWindows_->setChecked(preferences.keepsReportWindows);
+    session_->setChecked(preferences.restoresSession);
+
+    auto *tab = new QWidget;
+    auto *rows = new QFormLayout(tab);
+    rows->setFieldGrowthPolicy(QFormLayout::FieldsStayAtSizeHint);
+    rows->addRow(Xlate("&Language (from the next start):"), language_);
+    rows->addRow(session_);
+    rows->addRow(reportWindows_);
+    return tab;
 }
 
 DeskPreferences PreferencesDialog::preferences() const

@@ -26,6 +26,9 @@ public:
     void accept() override;
 
 private:
+    QWidget *makePageTab(const DeskPreferences &preferences);
+    QWidget *makeProgramTab(const DeskPreferences &preferences);
+
     QTabWidget *tabs_;
     UnitsPage *units_;
     QSpinBox *fontSize_;

@@ -55,17 +55,34 @@ TemplateDialog::TemplateDialog(QWidget *parent)
 {
     setWindowTitle(Xlate("Report from Template"));
     setWindowFlag(Qt::WindowContextHelpButtonHint, false);
-    auto *browseFile = new QPushButton(Xlate("Bro&wse..."));
-    browseFile->setAccessibleName(Xlate("Choose a template file"));
-    auto *browseData = new QPushButton(Xlate("Brow&se..."));
-    browseData->setAccessibleName(Xlate("Choose a data file"));
     file_->setAccessibleName(Xlate("Template file"));
     template_->setAccessibleName(Xlate("Template"));
     output_->setAccessibleName(Xlate("Table or block"));
     data_->setAccessibleName(Xlate("Data file"));
     message_->setWordWrap(true);
     message_->setObjectName(QStringLiteral("message"));
+    edit_ = buttons_->addButton(Xlate("&Edit Template"), QDialogButtonBox::ActionRole);
 
+    auto *layout = new QVBoxLayout(this);
+    layout->addLayout(makeForm());
+    layout->addWidget(import_, 1);
+    layout->addWidget(message_);
+    layout->addStretch();
+    layout->addWidget(buttons_);
+    import_->setFile(nullptr);
+    constexpr int usualWidth = 560;
+    resize(usualWidth, sizeHint().height());
+    followFields();
+    chooseAsLastTime();
+    check();
+}
+
+QLayout *TemplateDialog::makeForm()
+{
+    auto *browseFile = new QPushButton(Xlate("Bro&wse..."));
+    browseFile->setAccessibleName(Xlate("Choose a template file"));
+    auto *browseData = new QPushButton(Xlate("Brow&se..."));
+    browseData->setAccessibleName(Xlate("Choose a data file"));
     auto *form = new QFormLayout;
     const auto addRow = [form](const QString &text, QWidget *buddy, auto *row) {
         auto *label = plainLabel(text);
@@ -77,28 +94,22 @@ TemplateDialog::TemplateDialog(QWidget *parent)
     addRow(Xlate("Table or &block:"), output_, output_);
     addRow(Xlate("&Data:"), data_, withButton(data_, browseData));
     landXml_.emplace(*form);
-    auto *layout = new QVBoxLayout(this);
-    layout->addLayout(form);
-    layout->addWidget(import_, 1);
-    layout->addWidget(message_);
-    layout->addStretch();
-    import_->setFile(nullptr);
-    import_->setChangedHandler([this] { check(); });
-    layout->addWidget(buttons_);
-    constexpr int usualWidth = 560;
-    resize(usualWidth, sizeHint().height());
-
     connect(browseFile, &QPushButton::clicked, this,
             [this] { browse(*file_, Xlate("Choose a template file"), Xlate("Templates (*.xml);;All files (*)")); });
     connect(browseData, &QPushButton::clicked, this, [this] {
         browse(*data_, Xlate("Choose a data file"),
                Xlate("Data (*.csv *.txt *.xml *.landxml *.gpkg *.sqlite *.db);;All files (*)"));
     });
+    return form;
+}
+
+void TemplateDialog::followFields()
+{
+    import_->setChangedHandler([this] { check(); });
     connect(file_, &QLineEdit::textChanged, this, &TemplateDialog::readTemplates);
     connect(template_, &QComboBox::currentIndexChanged, this, &TemplateDialog::readOutputs);
     connect(output_, &QComboBox::currentIndexChanged, this, &TemplateDialog::useOutput);
     connect(data_, &QLineEdit::textChanged, this, &TemplateDialog::readData);
-    edit_ = buttons_->addButton(Xlate("&Edit Template"), QDialogButtonBox::ActionRole);
     connect(edit_, &QPushButton::clicked, this, [this] {
         const QString path = file_->text();
         reject();
@@ -106,13 +117,15 @@ TemplateDialog::TemplateDialog(QWidget *parent)
     });
     connect(buttons_, &QDialogButtonBox::accepted, this, &TemplateDialog::accept);
     connect(buttons_, &QDialogButtonBox::rejected, this, &TemplateDialog::reject);
+}
 
+void TemplateDialog::chooseAsLastTime()
+{
     file_->setText(GetProfileString(QString(), fileEntry));
     template_->setCurrentIndex(qMax(0, template_->findData(GetProfileString(QString(), nameEntry))));
     output_->setCurrentIndex(qMax(0, output_->findText(GetProfileString(QString(), outputEntry))));
     data_->setText(GetProfileString(QString(), dataEntry));
     landXml_->choose(QJsonDocument::fromJson(GetProfileString(QString(), landXmlEntry).toUtf8()).object());
-    check();
 }
 
 TemplateDialog::~TemplateDialog() = default;

@@ -37,6 +37,9 @@ public:
     void accept() override;
 
 private:
+    QLayout *makeForm();
+    void followFields();
+    void chooseAsLastTime();
     void browse(QLineEdit &field, const QString &title, const QString &filter);
     void readTemplates();
     void readOutputs();

@@ -1,10 +1,9 @@
 #include "UnitsPage.h"
 
+#include "BearingText.h"
 #include "OrientationOrder.h"
 #include "PlainWidgets.h"
 #include "TextBuffer.h"
-#include "UFormatAngle.h"
-#include "UFormatBearing.h"
 #include "UnitFactors.h"
 #include "ValueBoxes.h"
 #include "VariableType.h"
@@ -100,57 +99,70 @@ UnitsPage::UnitsPage(const UJobSettings &settings, QWidget *parent)
       bearingReference_(
           choiceOf<unsigned>(settings.bearingReference, {{0U, Xlate("From north")}, {1U, Xlate("From south")}})),
       bearingPadding_(new QCheckBox(Xlate("Leading &zeros"))),
+      marksLabel_(plainLabel(Xlate("Angle &marks:"))),
       samples_(plainLabel())
 {
     auto *layout = new QHBoxLayout(this);
     auto *form = new QFormLayout;
-    addPair(*form, Xlate("&Lengths:"), lengthUnit_, Xlate("Decimals:"), lengthDecimals_);
-    addPair(*form, Xlate("&Areas:"), areaUnit_, Xlate("Decimals of numbers:"), numberDecimals_);
-    form->addRow(Xlate("A&ngles:"), angleUnit_);
-    addPair(*form, Xlate("&Stations:"), stationFormat_, Xlate("Decimals:"), stationDecimals_);
-    form->addRow(Xlate("&Coordinates:"), northEastOrder_);
-    addPair(*form, Xlate("&Bearings:"), bearingUnit_, Xlate("Decimals:"), bearingDecimals_);
-    addPair(*form, QString(), bearingStyle_, QString(), bearingReference_);
-    form->addRow(QString(), bearingPadding_);
     bearingPadding_->setChecked(settings.bearingPadding != 0);
+    addFields(*form);
+    form->addRow(marksLabel_, makeMarks(settings));
+    layout->addLayout(form, 1);
+    layout->addWidget(makeSampleBox());
+    nameFields();
+    followFields();
+    showSamples();
+}
 
+void UnitsPage::addFields(QFormLayout &form)
+{
+    addPair(form, Xlate("&Lengths:"), lengthUnit_, Xlate("Decimals:"), lengthDecimals_);
+    addPair(form, Xlate("&Areas:"), areaUnit_, Xlate("Decimals of numbers:"), numberDecimals_);
+    form.addRow(Xlate("A&ngles:"), angleUnit_);
+    addPair(form, Xlate("&Stations:"), stationFormat_, Xlate("Decimals:"), stationDecimals_);
+    form.addRow(Xlate("&Coordinates:"), northEastOrder_);
+    addPair(form, Xlate("&Bearings:"), bearingUnit_, Xlate("Decimals:"), bearingDecimals_);
+    addPair(form, QString(), bearingStyle_, QString(), bearingReference_);
+    form.addRow(QString(), bearingPadding_);
+}
+
+/// A row of three fields, each with the mark that is shown after a part of an angle.
+QLayout *UnitsPage::makeMarks(const UJobSettings &settings)
+{
     auto *marks = new QHBoxLayout;
-    const std::array<QString, 3> markNames = {Xlate("Degree mark"), Xlate("Minute mark"), Xlate("Second mark")};
+    const std::array<QString, 3> names = {Xlate("Degree mark"), Xlate("Minute mark"), Xlate("Second mark")};
     for (std::size_t i = 0; i < angleMarks_.size(); ++i) {
         const char mark = settings.angleMarks.at(i);
-        angleMarks_.at(i) = new QLineEdit(mark == 0 ? QString() : QString(QLatin1Char(mark)));
+        auto *field = new QLineEdit(mark == 0 ? QString() : QString(QLatin1Char(mark)));
         // Printable characters of one byte: the marks have no others.
-        angleMarks_.at(i)->setValidator(new QRegularExpressionValidator(
-            QRegularExpression(QStringLiteral("[\\x{20}-\\x{7E}\\x{A0}-\\x{FF}]?")), angleMarks_.at(i)));
-        angleMarks_.at(i)->setMaximumWidth(3 * fontMetrics().averageCharWidth() + 20);
-        angleMarks_.at(i)->setAccessibleName(markNames.at(i));
-        angleMarks_.at(i)->setToolTip(markNames.at(i));
-        marks->addWidget(angleMarks_.at(i));
-        connect(angleMarks_.at(i), &QLineEdit::textChanged, this, &UnitsPage::showSamples);
+        field->setValidator(new QRegularExpressionValidator(
+            QRegularExpression(QStringLiteral("[\\x{20}-\\x{7E}\\x{A0}-\\x{FF}]?")), field));
+        field->setMaximumWidth(3 * fontMetrics().averageCharWidth() + 20);
+        field->setAccessibleName(names.at(i));
+        field->setToolTip(names.at(i));
+        marks->addWidget(field);
+        angleMarks_.at(i) = field;
     }
     marks->addStretch();
-    auto *marksLabel = plainLabel(Xlate("Angle &marks:"));
-    marksLabel->setBuddy(angleMarks_[0]);
-    form->addRow(marksLabel, marks);
-    layout->addLayout(form, 1);
+    marksLabel_->setBuddy(angleMarks_[0]);
+    return marks;
+}
 
-    auto *sampleBox = new QGroupBox(Xlate("Looks like"));
-    auto *sampleLayout = new QHBoxLayout(sampleBox);
+QWidget *UnitsPage::makeSampleBox()
+{
+    auto *box = new QGroupBox(Xlate("Looks like"));
+    auto *layout = new QHBoxLayout(box);
     samples_->setFont(QFontDatabase::systemFont(QFontDatabase::FixedFont));
     samples_->setAlignment(Qt::AlignTop | Qt::AlignLeft);
     // As wide as the widest of them from the beginning, so that nothing moves when another unit is chosen.
     constexpr int widestSample = 22; // characters
     samples_->setMinimumWidth(QFontMetrics(samples_->font()).averageCharWidth() * widestSample);
-    sampleLayout->addWidget(samples_);
-    layout->addWidget(sampleBox);
+    layout->addWidget(samples_);
+    return box;
+}
 
-    for (QComboBox *box : findChildren<QComboBox *>()) {
-        connect(box, &QComboBox::currentIndexChanged, this, &UnitsPage::showSamples);
-    }
-    for (QSpinBox *box : findChildren<QSpinBox *>()) {
-        connect(box, &QSpinBox::valueChanged, this, &UnitsPage::showSamples);
-    }
-    connect(bearingPadding_, &QCheckBox::toggled, this, &UnitsPage::showSamples);
+void UnitsPage::nameFields()
+{
     lengthUnit_->setAccessibleName(Xlate("Unit of lengths"));
     lengthDecimals_->setAccessibleName(Xlate("Decimals of lengths"));
     areaUnit_->setAccessibleName(Xlate("Unit of areas"));
@@ -163,7 +175,21 @@ UnitsPage::UnitsPage(const UJobSettings &settings, QWidget *parent)
     bearingDecimals_->setAccessibleName(Xlate("Decimals of bearings"));
     bearingStyle_->setAccessibleName(Xlate("Style of bearings"));
     bearingReference_->setAccessibleName(Xlate("Reference of bearings"));
-    showSamples();
+}
+
+/// Shows the samples again whenever a field changes.
+void UnitsPage::followFields()
+{
+    for (QComboBox *box : findChildren<QComboBox *>()) {
+        connect(box, &QComboBox::currentIndexChanged, this, &UnitsPage::showSamples);
+    }
+    for (QSpinBox *box : findChildren<QSpinBox *>()) {
+        connect(box, &QSpinBox::valueChanged, this, &UnitsPage::showSamples);
+    }
+    for (QLineEdit *mark : angleMarks_) {
+        connect(mark, &QLineEdit::textChanged, this, &UnitsPage::showSamples);
+    }
+    connect(bearingPadding_, &QCheckBox::toggled, this, &UnitsPage::showSamples);
 }
 
 UJobSettings UnitsPage::settings() const
@@ -192,11 +218,6 @@ UJobSettings UnitsPage::settings() const
 void UnitsPage::showSamples()
 {
     const UJobSettings chosen = settings();
-    QString bearing;
-    UFormatBearing(chosen.bearingUnit, chosen.bearingStyle, chosen.bearingDecimals, chosen.bearingPadding,
-                   chosen.bearingReference)
-        .ConvertToDisplayString(sampleBearing, bearing);
-    UFormatAngle::ConvertToDMSformatString(chosen.angleMarks[0], chosen.angleMarks[1], chosen.angleMarks[2], bearing);
     const auto number = [&chosen](double value) { return QString::number(value, 'f', chosen.numberDecimals); };
     kareport::TextBuffer length;
     chosen.appendUnitLength(length, sampleLength, {.fromInternal = true, .withUnit = true});
@@ -206,7 +227,7 @@ void UnitsPage::showSamples()
                               Xlate("Area"),    number(chosen.ConvertToDisplay(sampleArea, VARIABLE_AREA, 0)),
                               Xlate("Angle"),   number(chosen.ConvertToDisplay(sampleAngle, VARIABLE_ANGLE, 0)),
                               Xlate("Station"), station.view().toString(),
-                              Xlate("Bearing"), bearing,
+                              Xlate("Bearing"), bearingText(sampleBearing, chosen),
                               Xlate("Columns"), chosen.northEastOrder == 0 ? Xlate("E, N") : Xlate("N, E")};
     QString text;
     for (qsizetype i = 0; i + 1 < rows.size(); i += 2) {

@@ -8,7 +8,9 @@
 
 class QCheckBox;
 class QComboBox;
+class QFormLayout;
 class QLabel;
+class QLayout;
 class QLineEdit;
 class QSpinBox;
 
@@ -24,6 +26,11 @@ public:
     UJobSettings settings() const;
 
 private:
+    void addFields(QFormLayout &form);
+    QLayout *makeMarks(const UJobSettings &settings);
+    QWidget *makeSampleBox();
+    void nameFields();
+    void followFields();
     void showSamples();
 
     QComboBox *lengthUnit_;
@@ -39,6 +46,7 @@ private:
     QComboBox *bearingStyle_;
     QComboBox *bearingReference_;
     QCheckBox *bearingPadding_;
+    QLabel *marksLabel_;
     std::array<QLineEdit *, 3> angleMarks_ = {};
     QLabel *samples_;
 };

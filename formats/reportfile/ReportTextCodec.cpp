@@ -7,6 +7,7 @@
 #include <array>
 #include <cstdint>
 #include <cstring>
+#include <utility>
 
 namespace kareport
 {
@@ -85,33 +86,33 @@ std::size_t ReportTextEncoder::encode(QLatin1StringView text, char *out, bool la
     return encodeCharacters(bytes, bytes + text.size(), out, last);
 }
 
+/// Writes what was held back: the character after it says what it is.
+/// @param next  nothing at the end of the text
+ReportTextEncoder::Settled ReportTextEncoder::settle(std::optional<char16_t> next, char *out)
+{
+    const char16_t held = std::exchange(heldBack_, u'\0');
+    if (held == u'\r') {
+        if (next != u'\n') {
+            *out++ = '\r';
+        }
+        return {out, false};
+    }
+    if (next && QChar::isLowSurrogate(*next)) {
+        return {writeCharacter(out, QChar::surrogateToUcs4(held, *next)), true};
+    }
+    return {writeCharacter(out, QChar::ReplacementCharacter), false};
+}
+
 template <typename Character>
 std::size_t ReportTextEncoder::encodeCharacters(const Character *at, const Character *end, char *out, bool last)
 {
     const bool reportFile = lineEnds_ == LineEnds::ReportFile;
     char *const begin = out;
 
-    // What was held back is settled by the first character of this piece.
-    const auto settle = [&](char16_t next, bool hasNext) {
-        const char16_t held = heldBack_;
-        heldBack_ = 0;
-        if (held == u'\r') {
-            if (!(hasNext && next == u'\n')) {
-                *out++ = '\r';
-            }
-            return false;
-        }
-        if (hasNext && QChar::isLowSurrogate(next)) {
-            out = writeCharacter(out, QChar::surrogateToUcs4(held, next));
-            return true;
-        }
-        out = writeCharacter(out, QChar::ReplacementCharacter);
-        return false;
-    };
     if (heldBack_ != 0 && (at != end || last)) {
-        if (settle(at != end ? *at : u'\0', at != end)) {
-            ++at;
-        }
+        const Settled settled = settle(at != end ? std::optional<char16_t>(*at) : std::nullopt, out);
+        out = settled.out;
+        at += settled.takesNext ? 1 : 0;
     }
 
     const auto special = static_cast<Character>(reportFile ? u'\n' : u'\r');
@@ -134,9 +135,9 @@ std::size_t ReportTextEncoder::encodeCharacters(const Character *at, const Chara
                 if (at == end && !last) {
                     break;
                 }
-                if (settle(at != end ? *at : u'\0', at != end)) {
-                    ++at;
-                }
+                const Settled settled = settle(at != end ? std::optional<char16_t>(*at) : std::nullopt, out);
+                out = settled.out;
+                at += settled.takesNext ? 1 : 0;
             } else if (QChar::isLowSurrogate(character)) {
                 out = writeCharacter(out, QChar::ReplacementCharacter);
             } else {

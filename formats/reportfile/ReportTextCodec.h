@@ -6,6 +6,7 @@
 #include <QStringView>
 
 #include <cstddef>
+#include <optional>
 
 class QIODevice;
 
@@ -28,6 +29,13 @@ public:
     std::size_t encode(QLatin1StringView text, char *out, bool last);
 
 private:
+    struct Settled
+    {
+        char *out;      ///< where the next byte goes
+        bool takesNext; ///< the character after what was held back belongs to it
+    };
+
+    Settled settle(std::optional<char16_t> next, char *out);
     template <typename Character>
     std::size_t encodeCharacters(const Character *at, const Character *end, char *out, bool last);
 

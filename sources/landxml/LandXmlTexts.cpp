@@ -1,9 +1,8 @@
 #include "LandXmlTexts.h"
 
+#include "BearingText.h"
 #include "FixedNotation.h"
 #include "TextBuffer.h"
-#include "UFormatAngle.h"
-#include "UFormatBearing.h"
 #include "VariableType.h"
 
 #include <cmath>
@@ -20,17 +19,6 @@ QString numberText(double number, const UJobSettings &settings)
     const std::string_view digits = notation.digits();
     const QString text = QString::fromLatin1(digits.data(), static_cast<qsizetype>(digits.size()));
     return number < 0 && !notation.isZero() ? u'-' + text : text;
-}
-
-QString bearingText(double shown, const UJobSettings &settings)
-{
-    QString text;
-    UFormatBearing(settings.bearingUnit, settings.bearingStyle, settings.bearingDecimals, settings.bearingPadding,
-                   settings.bearingReference)
-        .ConvertToDisplayString(shown, text);
-    UFormatAngle::ConvertToDMSformatString(settings.angleMarks[0], settings.angleMarks[1], settings.angleMarks[2],
-                                           text);
-    return text;
 }
 
 QString lengthText(double shown, const UJobSettings &settings)

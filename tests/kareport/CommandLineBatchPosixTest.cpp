@@ -6,6 +6,7 @@
 #include <QHash>
 #include <QStandardPaths>
 
+#include <algorithm>
 #include <csignal>
 #include <sys/types.h>
 #include <unistd.h>
@@ -168,6 +169,42 @@ TEST(CommandLineBatch, ADistributorSpreadsIt)
     }
 }
 
+/// How many of the outputs of a batch are there.
+int madeOutputs(const SharedBatch &batch)
+{
+    const QStringList outputs = batch.outputs();
+    return static_cast<int>(std::count_if(outputs.begin(), outputs.end(), [&batch](const QString &name) {
+        return QFileInfo::exists(batch.path(qPrintable(name)));
+    }));
+}
+
+/// Runs a batch and kills it, without a warning, as soon as so many outputs are there.
+void killAfter(const SharedBatch &batch, const Distributor &distributor, int target)
+{
+    QProcess process;
+    startGroup(process, batch.path(), distributor.program, distributor.arguments);
+    for (int turn = 0; turn < 6000 && process.state() == QProcess::Running && madeOutputs(batch) < target; ++turn) {
+        process.waitForFinished(2);
+    }
+    if (process.processId() > 0) {
+        kill(-static_cast<pid_t>(process.processId()), SIGKILL);
+    }
+    ASSERT_TRUE(process.waitForFinished(30'000)) << distributor.name;
+}
+
+/// The outputs that are there, with their times.
+QHash<QString, QDateTime> timesOfOutputs(const SharedBatch &batch)
+{
+    QHash<QString, QDateTime> times;
+    for (const QString &name : batch.outputs()) {
+        const QFileInfo info(batch.path(qPrintable(name)));
+        if (info.exists()) {
+            times.insert(name, info.lastModified());
+        }
+    }
+    return times;
+}
+
 TEST(CommandLineBatch, KilledAndRunAgainItIsWhole)
 {
     if (QStandardPaths::findExecutable(QStringLiteral("parallel")).isEmpty()) {
@@ -177,37 +214,15 @@ TEST(CommandLineBatch, KilledAndRunAgainItIsWhole)
     for (const Distributor &distributor : distributors()) {
         const SharedBatch batch;
         int before = 0;
-        // Killed without a warning, again and again, at moments that come as they come.
+        // Killed again and again, at moments that come as they come.
         for (int round = 0; round < 6 && before < whole.size(); ++round) {
-            QProcess process;
-            startGroup(process, batch.path(), distributor.program, distributor.arguments);
-            const int target = std::min<int>(before + 5, static_cast<int>(whole.size()));
-            for (int turn = 0; turn < 6000 && process.state() == QProcess::Running; ++turn) {
-                process.waitForFinished(2);
-                int now = 0;
-                for (const QString &name : batch.outputs()) {
-                    now += QFileInfo::exists(batch.path(qPrintable(name))) ? 1 : 0;
-                }
-                if (now >= target) {
-                    break;
-                }
-            }
-            if (process.processId() > 0) {
-                kill(-static_cast<pid_t>(process.processId()), SIGKILL);
-            }
-            ASSERT_TRUE(process.waitForFinished(30'000)) << distributor.name;
+            killAfter(batch, distributor, std::min<int>(before + 5, static_cast<int>(whole.size())));
             const int now = expectWholeOutputs(batch, whole);
             EXPECT_GE(now, before) << distributor.name;
             before = now;
         }
         // What is there already is not made again, and what is missing is.
-        QHash<QString, QDateTime> made;
-        for (const QString &name : batch.outputs()) {
-            const QFileInfo info(batch.path(qPrintable(name)));
-            if (info.exists()) {
-                made.insert(name, info.lastModified());
-            }
-        }
+        const QHash<QString, QDateTime> made = timesOfOutputs(batch);
         QProcess process;
         startGroup(process, batch.path(), distributor.program, distributor.arguments);
         ASSERT_TRUE(process.waitForFinished(110'000)) << distributor.name;

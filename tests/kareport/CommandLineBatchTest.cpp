@@ -85,17 +85,36 @@ TEST(CommandLineBatch, TheListMayComeFromAPipe)
     EXPECT_EQ(folder.written(), "a.txt=A b.txt=B");
 }
 
+/// A batch of which jobs fail.
+struct FailedBatch
+{
+    const char *line;
+    int status;
+    const char *written;
+    std::vector<const char *> err;
+    const char *reason;
+};
+
+void expectFailures(const std::vector<FailedBatch> &rows)
+{
+    for (const FailedBatch &row : rows) {
+        const BatchFolder folder;
+        folder.put("bad.json", "{\"report\": ]");
+        folder.put("unwritable.json", lineJob("U", "missing-folder/u.txt"));
+        folder.put("again.json", lineJob("A2", "./a.txt"));
+        folder.put("nodata.json", folder.bytesOf("job.json").replace("points.csv", "none.csv"));
+        const ProgramRun run = folder.run(row.line);
+        EXPECT_EQ(run.status, row.status) << row.reason << "\n" << run.all().constData();
+        EXPECT_EQ(folder.written(), row.written) << row.reason;
+        for (const char *text : row.err) {
+            EXPECT_TRUE(run.err.contains(text)) << row.reason << ": " << text << "\n" << run.all().constData();
+        }
+    }
+}
+
 TEST(CommandLineBatch, AJobThatFailsDoesNotKeepTheOthersFromBeingMade)
 {
-    struct Row
-    {
-        const char *line;
-        int status;
-        const char *written;
-        std::vector<const char *> err;
-        const char *reason;
-    };
-    const Row rows[] = {
+    expectFailures({
         {"render a.json none.json b.json",
          2,
          "a.txt=A b.txt=B",
@@ -116,6 +135,12 @@ TEST(CommandLineBatch, AJobThatFailsDoesNotKeepTheOthersFromBeingMade)
          "",
          {"0 of 3 jobs made, 3 failed\n"},
          "the greatest status, whatever comes last"},
+    });
+}
+
+TEST(CommandLineBatch, AJobThatRepeatsAnotherOrIsWrongForAKeyFailsAlone)
+{
+    expectFailures({
         {"render a.json again.json b.json",
          2,
          "a.txt=A b.txt=B",
@@ -133,20 +158,7 @@ TEST(CommandLineBatch, AJobThatFailsDoesNotKeepTheOthersFromBeingMade)
          "",
          {"\"report.7.line\"", "0 of 2 jobs made, 2 failed"},
          "a key that leads nowhere"},
-    };
-    for (const Row &row : rows) {
-        const BatchFolder folder;
-        folder.put("bad.json", "{\"report\": ]");
-        folder.put("unwritable.json", lineJob("U", "missing-folder/u.txt"));
-        folder.put("again.json", lineJob("A2", "./a.txt"));
-        folder.put("nodata.json", folder.bytesOf("job.json").replace("points.csv", "none.csv"));
-        const ProgramRun run = folder.run(row.line);
-        EXPECT_EQ(run.status, row.status) << row.reason << "\n" << run.all().constData();
-        EXPECT_EQ(folder.written(), row.written) << row.reason;
-        for (const char *text : row.err) {
-            EXPECT_TRUE(run.err.contains(text)) << row.reason << ": " << text << "\n" << run.all().constData();
-        }
-    }
+    });
 }
 
 TEST(CommandLineBatch, NoTwoJobsWriteOneFile)

@@ -85,6 +85,77 @@ int drive(Supervisor &supervisor, const Steps &steps, const QString &named)
     return 1;
 }
 
+/// What the command line asks for.
+struct Options
+{
+    const QCommandLineOption seed{QStringLiteral("seed"), QStringLiteral("The first seed."), QStringLiteral("N"),
+                                  QStringLiteral("1")};
+    const QCommandLineOption steps{QStringLiteral("steps"), QStringLiteral("Steps of a sequence."), QStringLiteral("N"),
+                                   QStringLiteral("300")};
+    const QCommandLineOption seconds{QStringLiteral("seconds"),
+                                     QStringLiteral("Goes on with the next seeds for so long."), QStringLiteral("N"),
+                                     QStringLiteral("0")};
+    const QCommandLineOption runs{QStringLiteral("runs"), QStringLiteral("Goes on with the next seeds, so many."),
+                                  QStringLiteral("N"), QStringLiteral("1")};
+    const QCommandLineOption faults{QStringLiteral("faults"),
+                                    QStringLiteral("Lets files, printers and editors fail as well.")};
+    const QCommandLineOption log{QStringLiteral("log"), QStringLiteral("Also writes what is found to a file."),
+                                 QStringLiteral("FILE")};
+    const QCommandLineOption replay{QStringLiteral("replay"),
+                                    QStringLiteral("Does the steps of a file, or of each of several."),
+                                    QStringLiteral("FILE")};
+    QCommandLineOption worker{QStringLiteral("worker"), QString(), QStringLiteral("DIR")};
+    QCommandLineOption from{QStringLiteral("from"), QString(), QStringLiteral("N")};
+    QCommandLineParser parser;
+
+    explicit Options(const QCoreApplication &application)
+    {
+        worker.setFlags(QCommandLineOption::HiddenFromHelp);
+        from.setFlags(QCommandLineOption::HiddenFromHelp);
+        parser.setApplicationDescription(QStringLiteral(
+            "Drives the desk at random and checks after each step that nothing is lost. Exit status: 0 all is "
+            "well, 1 a violation was found, 2 the command line is wrong."));
+        parser.addHelpOption();
+        parser.addOptions({seed, steps, runs, seconds, faults, log, replay, worker, from});
+        parser.process(application);
+    }
+};
+
+int replay(Supervisor &supervisor, const QStringList &files)
+{
+    return std::accumulate(files.begin(), files.end(), 0, [&supervisor](int status, const QString &file) {
+        return std::max(status, drive(supervisor, readSteps(file), file));
+    });
+}
+
+/// Drives sequences of several seeds, one after the other.
+int search(Supervisor &supervisor, const Options &options)
+{
+    bool isSeed = false;
+    bool isCount = false;
+    bool isRuns = false;
+    bool isSeconds = false;
+    quint64 seed = options.parser.value(options.seed).toULongLong(&isSeed);
+    const int count = options.parser.value(options.steps).toInt(&isCount);
+    const int runs = options.parser.value(options.runs).toInt(&isRuns);
+    const qint64 milliseconds = options.parser.value(options.seconds).toLongLong(&isSeconds) * 1000;
+    if (!isSeed || !isCount || !isRuns || !isSeconds || count < 1) {
+        std::cerr
+            << "kareport-monkey: --seed, --steps, --runs and --seconds are followed by numbers, as in --seed 7 --steps 300\n";
+        return 2;
+    }
+    QElapsedTimer time;
+    time.start();
+    int violations = 0;
+    int done = 0;
+    do {
+        violations += drive(supervisor, makeSteps(seed, count, options.parser.isSet(options.faults)),
+                            QStringLiteral("seed %1").arg(seed));
+        ++seed;
+    } while (++done < runs || time.elapsed() < milliseconds);
+    return violations > 0 ? 1 : 0;
+}
+
 } // namespace
 
 int main(int argc, char **argv)
@@ -98,65 +169,11 @@ int main(int argc, char **argv)
         application = std::make_unique<QCoreApplication>(argc, argv);
     }
     QCoreApplication::setApplicationName(QStringLiteral("kareport-monkey"));
-    QCommandLineParser parser;
-    parser.setApplicationDescription(QStringLiteral(
-        "Drives the desk at random and checks after each step that nothing is lost. Exit status: 0 all is well, 1 a violation "
-        "was found, 2 the command line is wrong."));
-    parser.addHelpOption();
-    const QCommandLineOption seedOption(QStringLiteral("seed"), QStringLiteral("The first seed."), QStringLiteral("N"),
-                                        QStringLiteral("1"));
-    const QCommandLineOption stepsOption(QStringLiteral("steps"), QStringLiteral("Steps of a sequence."),
-                                         QStringLiteral("N"), QStringLiteral("300"));
-    const QCommandLineOption secondsOption(QStringLiteral("seconds"),
-                                           QStringLiteral("Goes on with the next seeds for so long."),
-                                           QStringLiteral("N"), QStringLiteral("0"));
-    const QCommandLineOption runsOption(QStringLiteral("runs"), QStringLiteral("Goes on with the next seeds, so many."),
-                                        QStringLiteral("N"), QStringLiteral("1"));
-    const QCommandLineOption faultsOption(QStringLiteral("faults"),
-                                          QStringLiteral("Lets files, printers and editors fail as well."));
-    const QCommandLineOption logOption(QStringLiteral("log"), QStringLiteral("Also writes what is found to a file."),
-                                       QStringLiteral("FILE"));
-    const QCommandLineOption replayOption(QStringLiteral("replay"),
-                                          QStringLiteral("Does the steps of a file, or of each of several."),
-                                          QStringLiteral("FILE"));
-    QCommandLineOption workerOption(QStringLiteral("worker"), QString(), QStringLiteral("DIR"));
-    QCommandLineOption fromOption(QStringLiteral("from"), QString(), QStringLiteral("N"));
-    workerOption.setFlags(QCommandLineOption::HiddenFromHelp);
-    fromOption.setFlags(QCommandLineOption::HiddenFromHelp);
-    parser.addOptions({seedOption, stepsOption, runsOption, secondsOption, faultsOption, logOption, replayOption,
-                       workerOption, fromOption});
-    parser.process(*application);
+    const Options options(*application);
     if (isWorker) {
-        return work(parser.value(workerOption), parser.value(fromOption).toULongLong());
+        return work(options.parser.value(options.worker), options.parser.value(options.from).toULongLong());
     }
-    Supervisor supervisor(QCoreApplication::applicationFilePath(), parser.value(logOption));
-    if (parser.isSet(replayOption)) {
-        const QStringList files = parser.values(replayOption);
-        return std::accumulate(files.begin(), files.end(), 0, [&supervisor](int status, const QString &file) {
-            return std::max(status, drive(supervisor, readSteps(file), file));
-        });
-    }
-    bool isSeed = false;
-    bool isCount = false;
-    bool isRuns = false;
-    bool isSeconds = false;
-    quint64 seed = parser.value(seedOption).toULongLong(&isSeed);
-    const int count = parser.value(stepsOption).toInt(&isCount);
-    const int runs = parser.value(runsOption).toInt(&isRuns);
-    const qint64 milliseconds = parser.value(secondsOption).toLongLong(&isSeconds) * 1000;
-    if (!isSeed || !isCount || !isRuns || !isSeconds || count < 1) {
-        std::cerr
-            << "kareport-monkey: --seed, --steps, --runs and --seconds are followed by numbers, as in --seed 7 --steps 300\n";
-        return 2;
-    }
-    QElapsedTimer time;
-    time.start();
-    int violations = 0;
-    int done = 0;
-    do {
-        violations +=
-            drive(supervisor, makeSteps(seed, count, parser.isSet(faultsOption)), QStringLiteral("seed %1").arg(seed));
-        ++seed;
-    } while (++done < runs || time.elapsed() < milliseconds);
-    return violations > 0 ? 1 : 0;
+    Supervisor supervisor(QCoreApplication::applicationFilePath(), options.parser.value(options.log));
+    return options.parser.isSet(options.replay) ? replay(supervisor, options.parser.values(options.replay))
+                                                : search(supervisor, options);
 }

@@ -153,7 +153,8 @@ bool ModelledReport::writeAsHost(const ReportStep &step)
     return true;
 }
 
-void ModelledReport::actAsHost(const ReportStep &step)
+/// Changes how the report is written. @return false for any other step
+bool ModelledReport::setUpAsHost(const ReportStep &step)
 {
     switch (step.op) {
     case ReportOp::Heading: {
@@ -177,6 +178,40 @@ void ModelledReport::actAsHost(const ReportStep &step)
         model_.setLinesPerPage(lines);
         break;
     }
+    default: return false;
+    }
+    return true;
+}
+
+/// Opens and closes views, and saves what changes no view. @return false for any other step
+bool ModelledReport::actUnseen(const ReportStep &step)
+{
+    switch (step.op) {
+    case ReportOp::RichText: actInRichText(step); break;
+    case ReportOp::SaveAlone: saveAlone(); break;
+    case ReportOp::SaveRichText: saveRichText(); break;
+    case ReportOp::OpenView:
+        if (views_.size() < 3) {
+            openView(step.b % 2 == 0);
+        }
+        break;
+    case ReportOp::CloseView:
+        if (views_.size() > 1) {
+            shown_.close(std::size_t(step.a) % views_.size());
+            views_.erase(views_.begin() + step.a % static_cast<int>(views_.size()));
+        }
+        break;
+    default: return false;
+    }
+    return true;
+}
+
+void ModelledReport::actAsHost(const ReportStep &step)
+{
+    if (actUnseen(step)) {
+        return;
+    }
+    switch (step.op) {
     case ReportOp::SetData:
         report().SetData(data(step.c));
         model_.setData(data(step.c));
@@ -187,28 +222,14 @@ void ModelledReport::actAsHost(const ReportStep &step)
         image_.clear();
         isModified_ = true;
         break;
-    case ReportOp::RichText: actInRichText(step); return;
     case ReportOp::RichTextOn: switchOn(); break;
     case ReportOp::RichTextOff: switchOff(); break;
     case ReportOp::Load: load(step); break;
-    case ReportOp::SaveAlone: saveAlone(); return;
-    case ReportOp::SaveRichText: saveRichText(); return;
     case ReportOp::Open: openSaved(); break;
     case ReportOp::ReloadRichText: reloadRichText(step); break;
-    case ReportOp::OpenView:
-        if (views_.size() < 3) {
-            openView(step.b % 2 == 0);
-        }
-        return;
-    case ReportOp::CloseView:
-        if (views_.size() > 1) {
-            shown_.close(std::size_t(step.a) % views_.size());
-            views_.erase(views_.begin() + step.a % static_cast<int>(views_.size()));
-        }
-        return;
     case ReportOp::Reload: reload(); break;
     default:
-        if (!writeAsHost(step)) {
+        if (!setUpAsHost(step) && !writeAsHost(step)) {
             return;
         }
     }
@@ -413,14 +434,13 @@ int ModelledReport::placeIn(int length, int number)
     return length <= range ? number % length : static_cast<int>(qint64(number) * (length - 1) / range);
 }
 
-void ModelledReport::actInView(Shown &shown, const ReportStep &step)
+/// What the user does in the control.
+void ModelledReport::editInView(UReportView &view, const ReportStep &step)
 {
-    UReportView &view = *shown.view;
     kareport::ReportEdit &edit = view.GetEdit();
     const int length = edit.document()->characterCount();
     const int place = placeIn(length, step.b);
     const int other = std::min(length - 1, place + step.c % (step.c % 3 == 0 ? 200 : 12));
-    EditSpy spy(edit);
     switch (step.op) {
     case ReportOp::Type:
         putCursor(edit, place);
@@ -460,6 +480,12 @@ void ModelledReport::actInView(Shown &shown, const ReportStep &step)
         break;
     default: break;
     }
+}
+
+void ModelledReport::actInView(Shown &shown, const ReportStep &step)
+{
+    EditSpy spy(shown.view->GetEdit());
+    editInView(*shown.view, step);
     editsSeen_ = spy.edits.size();
     for (const SeenEdit &seen : spy.edits) {
         if (!isAllCrLf()) {

@@ -50,6 +50,8 @@ private:
 
     static QString data(int seed);
 
+    bool setUpAsHost(const ReportStep &step);
+    bool actUnseen(const ReportStep &step);
     void actAsHost(const ReportStep &step);
 
     /// What has nothing to do with a text: panes, and what happens by itself.
@@ -100,6 +102,7 @@ private:
     /// A place in a text, all over it also where that is long.
     static int placeIn(int length, int number);
 
+    void editInView(UReportView &view, const ReportStep &step);
     void actInView(Shown &shown, const ReportStep &step);
 
     static void putWholeLines(kareport::ReportEdit &edit, int from, int to, bool isWhole);

@@ -86,6 +86,24 @@ StartPage::StartPage(QWidget *parent)
     setAutoFillBackground(true);
     setBackgroundRole(QPalette::Base);
     setForegroundRole(QPalette::Text);
+    makeQuiet(*noRecent_, QPalette::Base);
+    static_cast<QLabel *>(noRecent_)->setWordWrap(true);
+    noRecent_->setContentsMargins(6, 3, 6, 3); // as the entries of a list
+
+    auto *grid = new QGridLayout(this);
+    grid->setContentsMargins(margin, margin, margin, margin);
+    grid->setHorizontalSpacing(gap);
+    grid->setVerticalSpacing(6);
+    grid->addLayout(makeHead(), 0, 0, 1, 3);
+    grid->setRowMinimumHeight(1, 12);
+    addLists(*grid);
+    grid->setRowStretch(4, 1);
+    connectLists();
+}
+
+/// The program's name and what to do, next to its icon.
+QLayout *StartPage::makeHead()
+{
     QLabel *name = caption(QStringLiteral("KaReport"), this);
     constexpr qreal larger = 1.5;
     QFont large = name->font();
@@ -94,10 +112,6 @@ StartPage::StartPage(QWidget *parent)
     QLabel *what = plainLabel(Xlate("Open a job or a saved report, or drop a file here."), this);
     what->setWordWrap(true);
     makeQuiet(*what, QPalette::Base);
-    makeQuiet(*noRecent_, QPalette::Base);
-    static_cast<QLabel *>(noRecent_)->setWordWrap(true);
-    noRecent_->setContentsMargins(6, 3, 6, 3); // as the entries of a list
-
     auto *titles = new QVBoxLayout;
     titles->setSpacing(2);
     titles->addWidget(name);
@@ -106,13 +120,11 @@ StartPage::StartPage(QWidget *parent)
     head->setSpacing(12);
     head->addWidget(picture_);
     head->addLayout(titles, 1);
+    return head;
+}
 
-    auto *grid = new QGridLayout(this);
-    grid->setContentsMargins(margin, margin, margin, margin);
-    grid->setHorizontalSpacing(gap);
-    grid->setVerticalSpacing(6);
-    grid->addLayout(head, 0, 0, 1, 3);
-    grid->setRowMinimumHeight(1, 12);
+void StartPage::addLists(QGridLayout &grid)
+{
     const struct
     {
         QString caption;
@@ -122,14 +134,16 @@ StartPage::StartPage(QWidget *parent)
     for (const auto &[text, list] : columns) {
         QLabel *label = caption(text, this);
         label->setIndent(6); // as the entries of a list
-        grid->addWidget(label, 2, column);
-        grid->addWidget(list, 3, column, 2, 1);
-        grid->setColumnStretch(column, column == 0 ? 2 : 3);
+        grid.addWidget(label, 2, column);
+        grid.addWidget(list, 3, column, 2, 1);
+        grid.setColumnStretch(column, column == 0 ? 2 : 3);
         ++column;
     }
-    grid->addWidget(noRecent_, 3, 1);
-    grid->setRowStretch(4, 1);
+    grid.addWidget(noRecent_, 3, 1);
+}
 
+void StartPage::connectLists()
+{
     commands_->setNeighbours(nullptr, recent_);
     recent_->setNeighbours(commands_, examples_);
     examples_->setNeighbours(recent_, nullptr);

@@ -5,6 +5,8 @@
 #include <QWidget>
 
 class QAction;
+class QGridLayout;
+class QLayout;
 
 namespace kareport
 {
@@ -34,6 +36,10 @@ protected:
     void changeEvent(QEvent *event) override;
 
 private:
+    QLayout *makeHead();
+    void addLists(QGridLayout &grid);
+    void connectLists();
+
     QWidget *picture_;
     QList<QAction *> actions_;
     EntryList *commands_;

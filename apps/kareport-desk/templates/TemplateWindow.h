@@ -70,6 +70,8 @@ private:
     // TemplateWindowLayout.cpp
     void makeDialogs();
     void makeBody();
+    QWidget *makeTextHalf();
+    QWidget *makePageHalf();
     void makeMenus();
     void addFileMenu();
     void addEditMenu();

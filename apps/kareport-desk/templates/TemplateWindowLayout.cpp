@@ -97,6 +97,25 @@ void TemplateWindow::makeDialogs()
 
 void TemplateWindow::makeBody()
 {
+    auto *halves = new QSplitter(Qt::Horizontal);
+    halves->addWidget(makeTextHalf());
+    halves->addWidget(makePageHalf());
+    halves->setChildrenCollapsible(false);
+    setCentralWidget(halves);
+    templateName_ = plainLabel();
+    templateName_->setAccessibleName(Xlate("Template"));
+    place_ = plainLabel();
+    statusBar()->addPermanentWidget(templateName_);
+    statusBar()->addPermanentWidget(place_);
+    constexpr QSize usualSize(1280, 800);
+    resize(usualSize.boundedTo(QGuiApplication::primaryScreen()->availableSize()));
+    halves->setSizes({width() / 2, width() / 2});
+    edit_->setFocus();
+}
+
+/// The text of the template with its find bar, above the remarks on it.
+QWidget *TemplateWindow::makeTextHalf()
+{
     edit_ = new TemplateTextEdit;
     findBar_ = new TemplateFindBar(*edit_);
     remarkList_ = new QTreeWidget;
@@ -112,18 +131,24 @@ void TemplateWindow::makeBody()
     remarkList_->header()->setSectionResizeMode(0, QHeaderView::ResizeToContents);
     remarkList_->header()->setSectionResizeMode(1, QHeaderView::ResizeToContents);
 
-    auto *textHalf = new QWidget;
-    auto *textLayout = new QVBoxLayout(textHalf);
-    textLayout->setContentsMargins(0, 0, 0, 0);
-    textLayout->setSpacing(0);
-    textLayout->addWidget(edit_, 1);
-    textLayout->addWidget(findBar_);
-    auto *left = new QSplitter(Qt::Vertical);
-    left->addWidget(textHalf);
-    left->addWidget(remarkList_);
-    left->setStretchFactor(0, 4);
-    left->setStretchFactor(1, 1);
+    auto *text = new QWidget;
+    auto *layout = new QVBoxLayout(text);
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->setSpacing(0);
+    layout->addWidget(edit_, 1);
+    layout->addWidget(findBar_);
+    auto *half = new QSplitter(Qt::Vertical);
+    half->addWidget(text);
+    half->addWidget(remarkList_);
+    half->setStretchFactor(0, 4);
+    half->setStretchFactor(1, 1);
+    return half;
+}
 
+/// The first pages of the report, below the choice of their data.
+QWidget *TemplateWindow::makePageHalf()
+{
+    constexpr int gap = 6;
     page_ = new TemplatePage;
     dataChoice_ = new QComboBox;
     dataChoice_->setAccessibleName(Xlate("Data of the pages"));
@@ -132,9 +157,6 @@ void TemplateWindow::makeBody()
     dataChoice_->setMinimumContentsLength(leastLetters);
     auto *dataLabel = plainLabel(Xlate("&Data:"));
     dataLabel->setBuddy(dataChoice_);
-    templateName_ = plainLabel();
-    templateName_->setAccessibleName(Xlate("Template"));
-    constexpr int gap = 6;
     message_ = plainLabel();
     message_->setObjectName(QStringLiteral("message"));
     message_->setAccessibleName(Xlate("State of the pages"));
@@ -142,29 +164,17 @@ void TemplateWindow::makeBody()
     message_->setMargin(gap);
     message_->setTextInteractionFlags(Qt::TextSelectableByMouse | Qt::TextSelectableByKeyboard);
     message_->hide();
-    auto *right = new QWidget;
-    auto *rightLayout = new QVBoxLayout(right);
+    auto *half = new QWidget;
+    auto *layout = new QVBoxLayout(half);
     auto *row = new QHBoxLayout;
     row->setContentsMargins(gap, gap, gap, 0);
     row->addWidget(dataLabel);
     row->addWidget(dataChoice_, 1);
-    rightLayout->setContentsMargins(0, 0, 0, 0);
-    rightLayout->addLayout(row);
-    rightLayout->addWidget(message_);
-    rightLayout->addWidget(page_, 1);
-
-    auto *halves = new QSplitter(Qt::Horizontal);
-    halves->addWidget(left);
-    halves->addWidget(right);
-    halves->setChildrenCollapsible(false);
-    setCentralWidget(halves);
-    place_ = plainLabel();
-    statusBar()->addPermanentWidget(templateName_);
-    statusBar()->addPermanentWidget(place_);
-    constexpr QSize usualSize(1280, 800);
-    resize(usualSize.boundedTo(QGuiApplication::primaryScreen()->availableSize()));
-    halves->setSizes({width() / 2, width() / 2});
-    edit_->setFocus();
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->addLayout(row);
+    layout->addWidget(message_);
+    layout->addWidget(page_, 1);
+    return half;
 }
 
 void TemplateWindow::makeMenus()
