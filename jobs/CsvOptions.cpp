@@ -98,9 +98,8 @@ void readNumberStyle(const JsonNode &set, NumberStyle &style)
     const QString text = thousands.text();
     const QString taken = QStringLiteral("0123456789+-\"\r\n") + QLatin1Char(style.decimal);
     if (text.toUcs4().size() != 1 || text[0].isLetter() || text[0].isNull() || taken.contains(text[0])) {
-        thousands.fail(
-            Xlate("one character that is neither a digit, a letter nor a sign, and not the decimal sign, was "
-                  "expected"));
+        thousands.fail(Xlate(
+            "one character was expected, other than a digit, a letter, a sign, a quote, a line end or the decimal sign"));
     }
     style.thousands = text.toStdString();
 }
@@ -119,8 +118,8 @@ void readDelimiter(const JsonNode &node, CsvDialect &dialect)
     } else {
         dialect.delimiter = readMark(
             node,
-            Xlate("one ASCII character that is not a letter, a digit, a sign, a quote or a line end, or one of %1, was "
-                  "expected")
+            Xlate(
+                "one ASCII character was expected, other than a letter, a digit, a sign, a quote or a line end, or one of the words %1")
                 .arg(QStringLiteral("whitespace, auto")));
     }
 }
@@ -145,8 +144,7 @@ CsvDialect readCsvDialect(const JsonNode &set)
         if (const auto known = textEncodingFromKey(encoding.text())) {
             dialect.encoding = *known;
         } else {
-            const QString keys = QStringLiteral("utf-8, latin-1, windows-1252, utf-16");
-            encoding.fail(oneOfExpected(encoding.text(), keys.split(QStringLiteral(", "))));
+            encoding.fail(oneOfExpected(encoding.text(), textEncodingKeys()));
         }
     }
     readNumberStyle(set, dialect.numbers);
@@ -154,7 +152,7 @@ CsvDialect readCsvDialect(const JsonNode &set)
     if (const JsonNode comment = set[QStringLiteral("comment")]; comment.exists()) {
         dialect.comment = readMark(
             comment,
-            Xlate("one ASCII character that is not a letter, a digit, a sign, a quote or a line end was expected"));
+            Xlate("one ASCII character was expected, other than a letter, a digit, a sign, a quote or a line end"));
     }
     dialect.passesBlankLines = set[QStringLiteral("skipBlankLines")].boolean(false);
     checkDelimiter(set, dialect);

@@ -1,9 +1,8 @@
 #include "GroupTextReader.h"
 
-#include "NearestName.h"
+#include "PlaceholderPiece.h"
 #include "TextFolding.h"
 #include "UnitFactors.h"
-#include "Xlate.h"
 
 #include <algorithm>
 #include <optional>
@@ -15,8 +14,6 @@ namespace
 {
 
 using Piece = GroupText::Piece;
-
-constexpr qsizetype longestQuote = 40;
 
 Piece textPiece(const QString &text)
 {
@@ -40,7 +37,7 @@ QStringList expectedNames(const std::vector<FoundVariable> &by)
 {
     QStringList names;
     for (const FoundVariable &variable : by) {
-        names.append(u'{' + variable.name + u'}');
+        names.append(inBraces(variable.name));
     }
     for (const char *name : {"{count}", "{sum:...}", "{mean:...}", "{min:...}", "{max:...}", "{count:...}",
                              "{lengthUnit}", "{areaUnit}", "{angleUnit}"})
@@ -88,38 +85,24 @@ GroupText readGroupText(const TableShape::Name &text, const std::vector<FoundVar
                         VariableLookup &lookup)
 {
     GroupText read;
-    const QString &all = text.text;
+    const QStringView all = text.text;
     for (qsizetype at = 0; at < all.size();) {
-        const qsizetype brace = all.indexOf(u'{', at);
-        if (brace != at) {
-            const qsizetype end = brace < 0 ? all.size() : brace;
-            read.pieces.push_back(textPiece(all.sliced(at, end - at)));
-            at = end;
+        const PlaceholderPiece next = placeholderPieceAt(all, at);
+        at = next.end;
+        if (next.kind == PlaceholderPiece::Kind::Text) {
+            read.pieces.push_back(textPiece(next.text.toString()));
             continue;
         }
-        if (all.sliced(at + 1).startsWith(u'{')) {
-            read.pieces.push_back(textPiece(QStringLiteral("{")));
-            at += 2;
-            continue;
-        }
-        const qsizetype end = all.indexOf(u'}', at);
-        if (end < 0) {
-            lookup.fail(
-                text.path,
-                Xlate("\"%1\" begins a placeholder that does not end: \"}\" was expected, or \"{{\" for a brace")
-                    .arg(shortened(all.sliced(at), longestQuote)));
+        if (next.kind == PlaceholderPiece::Kind::Unended) {
+            lookup.fail(text.path, unendedPlaceholder(next.text));
             break;
         }
-        const QString name = all.sliced(at + 1, end - at - 1);
-        const auto piece = placeholderOf(name, text.path, by, indexOf, lookup);
+        const auto piece = placeholderOf(next.text.toString(), text.path, by, indexOf, lookup);
         if (!piece) {
-            const QString braced = u'{' + shortened(name, longestQuote) + u'}';
-            lookup.fail(text.path,
-                        Xlate("unknown placeholder %1: %2").arg(braced, oneOfExpected(braced, expectedNames(by))));
+            lookup.fail(text.path, unknownPlaceholder(next.text, expectedNames(by)));
             break;
         }
         read.pieces.push_back(*piece);
-        at = end + 1;
     }
     return read;
 }

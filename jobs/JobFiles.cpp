@@ -16,21 +16,23 @@ namespace kareport
 namespace
 {
 
-/// The files that a job is made of, with the text that an output in their place gets.
-QHash<QString, QString> sourcesOf(const Job &job, const QString &path)
+/// What is wrong with an output in the place of a file.
+using ClashText = QString (*)(const QString &file);
+
+/// The files that a job is made of, with what is wrong with an output in their place.
+QHash<QString, ClashText> sourcesOf(const Job &job, const QString &path)
 {
-    QHash<QString, QString> sources;
+    QHash<QString, ClashText> sources;
     for (const Job::DataSet &set : job.data) {
         for (const QString &file : set.source->files()) {
-            sources.insert(fileIdentity(file), Xlate("\"%1\" is data of the job: another file was expected"));
+            sources.insert(fileIdentity(file), clashWithData);
         }
     }
     if (job.reportTemplate) {
-        sources.insert(fileIdentity(job.reportTemplate->file),
-                       Xlate("\"%1\" is the template of the job: another file was expected"));
+        sources.insert(fileIdentity(job.reportTemplate->file), clashWithTemplate);
     }
     if (!path.isEmpty()) {
-        sources.insert(fileIdentity(path), Xlate("\"%1\" is the job itself: another file was expected"));
+        sources.insert(fileIdentity(path), clashWithJob);
     }
     return sources;
 }
@@ -53,6 +55,26 @@ QStringList filesOf(const Job &job, const QString &path, QStringList (DataSource
 
 } // namespace
 
+QString clashWithJob(const QString &file)
+{
+    return Xlate("\"%1\" is the job itself: another file was expected").arg(file);
+}
+
+QString clashWithTemplate(const QString &file)
+{
+    return Xlate("\"%1\" is the template of the job: another file was expected").arg(file);
+}
+
+QString clashWithData(const QString &file)
+{
+    return Xlate("\"%1\" is data of the job: another file was expected").arg(file);
+}
+
+QString clashWithOutput(const QString &file, const QString &other)
+{
+    return Xlate("\"%1\" is the file of the output \"%2\" already: another file was expected").arg(file, other);
+}
+
 QString outputIdentity(const Output &output)
 {
     return output.isStandardOutput() ? standardOutputIdentity() : fileIdentity(output.file);
@@ -65,7 +87,7 @@ std::optional<OutputClash> outputClash(const Job &job, const QString &path)
 
 std::optional<OutputClash> outputClash(const Job &job, const std::vector<Output> &outputs, const QString &path)
 {
-    const QHash<QString, QString> sources = sourcesOf(job, path);
+    const QHash<QString, ClashText> sources = sourcesOf(job, path);
     QHash<QString, const Output *> earlier;
     for (qsizetype i = 0; i < qsizetype(outputs.size()); ++i) {
         const Output &output = outputs[static_cast<std::size_t>(i)];
@@ -75,14 +97,12 @@ std::optional<OutputClash> outputClash(const Job &job, const std::vector<Output>
             continue;
         }
         if (const auto source = sources.constFind(identity); source != sources.constEnd()) {
-            return OutputClash{number, source->arg(output.file)};
+            return OutputClash{number, source.value()(output.file)};
         }
         const Output *other = earlier.value(identity);
         // Both reports are written to standard output, one after the other.
         if (other != nullptr && !(other->isStandardOutput() && output.isStandardOutput())) {
-            return OutputClash{number,
-                               Xlate("\"%1\" is the file of the output \"%2\" already: another file was expected")
-                                   .arg(output.file, other->file)};
+            return OutputClash{number, clashWithOutput(output.file, other->file)};
         }
         earlier.insert(identity, &output);
     }

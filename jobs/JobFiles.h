@@ -17,6 +17,14 @@ struct OutputClash
     QString text;     ///< a sentence that says what was expected
 };
 
+///@{
+/// What is wrong with writing to a file that is needed for something else, as a sentence that says what was expected.
+QString clashWithJob(const QString &file);
+QString clashWithTemplate(const QString &file);
+QString clashWithData(const QString &file);
+QString clashWithOutput(const QString &file, const QString &other);
+///@}
+
 /// The file that an output becomes, as `fileIdentity` tells it.
 QString outputIdentity(const Output &output);
 

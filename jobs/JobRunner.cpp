@@ -8,6 +8,9 @@
 #include "LeastSize.h"
 #include "ReportAccess.h"
 #include "ReportTextCodec.h"
+#include "ReportTextWriter.h"
+#include "ResultOutputs.h"
+#include "SizeLimit.h"
 #include "TemplateSource.h"
 #include "Xlate.h"
 
@@ -15,6 +18,7 @@
 #include <QScopeGuard>
 
 #include <algorithm>
+#include <limits>
 
 namespace kareport
 {
@@ -91,6 +95,11 @@ std::optional<InputError> JobRunner::run(UReportDoc &report, ReportTextWriter *s
     }
     if (results_ != nullptr) {
         results_->beginReport({report.GetTitle(), job_.application, surroundings.time});
+    }
+    SizeLimit nowhere(nullptr, std::numeric_limits<qint64>::max());
+    ReportTextWriter noText(nowhere, LineEnds::PlainText);
+    if (stream == nullptr && discardsText_ && ResultOutputs::isTextUnwanted(job_)) {
+        stream = &noText;
     }
     report.StreamText(stream);
     const auto kept = qScopeGuard([&report] { report.StreamText(nullptr); });

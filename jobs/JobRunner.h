@@ -53,6 +53,8 @@ public:
     void measure() { isMeasuring_ = true; }
     /// Says which outputs receive the values that are written. They must outlive the runs; null for none.
     void setResults(ResultOutputs *results) { results_ = results; }
+    /// Has the report keep no text where only the values are wanted (`ResultOutputs::isTextUnwanted`).
+    void discardUnwantedText() { discardsText_ = true; }
     /// How the steps of the report that was made last fit, in their order, those alone that were written.
     const std::vector<StepFit> &fits() const { return fits_; }
     /// The notes on the report that was made last, also on one that was not finished.
@@ -83,6 +85,7 @@ private:
     bool heedsInterrupts_ = true;
     bool isStrict_ = false;
     bool isMeasuring_ = false;
+    bool discardsText_ = false;
     std::vector<StepFit> fits_;
     std::unique_ptr<Placeholders> placeholders_; ///< of the job's texts; null where they have none
     JobNotes notes_;

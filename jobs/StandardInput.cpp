@@ -1,5 +1,7 @@
 #include "StandardInput.h"
 
+#include "Xlate.h"
+
 #include <algorithm>
 #include <cerrno>
 #include <cstdio>
@@ -27,6 +29,11 @@ StandardInput StandardInput::read(std::size_t most)
         }
     }
     return input;
+}
+
+QString noStandardInputText()
+{
+    return Xlate("a window has no standard input: a file was expected");
 }
 
 } // namespace kareport

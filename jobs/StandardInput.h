@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QByteArray>
+#include <QString>
 
 #include <cstddef>
 
@@ -17,5 +18,8 @@ struct StandardInput
     /// can Qt open that of a pipe.
     static StandardInput read(std::size_t most);
 };
+
+/// What is wrong with a job that reads standard input and runs in a window, as a sentence that says what was expected.
+QString noStandardInputText();
 
 } // namespace kareport

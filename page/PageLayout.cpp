@@ -2,19 +2,11 @@
 
 #include "DefaultPrinter.h"
 #include "Preferences.h"
-#include "Profile.h"
 #include "ReportMargins.h"
 #include "ReportOrientation.h"
 
 namespace kareport
 {
-
-namespace
-{
-
-const QString marginsEntry = QStringLiteral("Report Margins");
-
-} // namespace
 
 std::optional<PageDevice> reportPageDevice()
 {
@@ -61,18 +53,17 @@ void PageLayout::applyGiven()
 
 void PageLayout::load()
 {
-    const QString kept = GetProfileString(QString(), marginsEntry);
-    if (kept.isEmpty()) {
-        save();
+    if (const auto kept = profileMargins(margins)) {
+        margins = *kept;
     } else {
-        margins = marginsFromText(kept, margins);
+        save();
     }
     fontSize = GetReportFontSize();
 }
 
 void PageLayout::save() const
 {
-    WriteProfileString(QString(), marginsEntry, marginsToText(margins));
+    setProfileMargins(margins);
 }
 
 } // namespace kareport

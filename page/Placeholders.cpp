@@ -1,12 +1,9 @@
 #include "Placeholders.h"
 
-#include "NearestName.h"
 #include "PageHeader.h"
 #include "PageMark.h"
+#include "PlaceholderPiece.h"
 #include "UnitFactors.h"
-#include "Xlate.h"
-
-#include <QLocale>
 
 namespace kareport
 {
@@ -14,44 +11,9 @@ namespace kareport
 namespace
 {
 
+using Kind = PlaceholderPiece::Kind;
+
 constexpr qsizetype pageMarksOfLabel = 3;
-constexpr qsizetype longestQuote = 40;
-
-/// A piece of a text: characters, or a placeholder.
-struct Piece
-{
-    enum class Kind
-    {
-        Text,
-        Placeholder,
-        Unended ///< a brace that begins a placeholder, and what follows it
-    };
-    Kind kind;
-    QStringView text; ///< of a placeholder, its name
-    qsizetype end;    ///< where the next piece begins
-};
-
-Piece pieceAt(QStringView text, qsizetype at)
-{
-    if (text[at] != u'{') {
-        const qsizetype brace = text.indexOf(u'{', at);
-        const qsizetype end = brace < 0 ? text.size() : brace;
-        return {Piece::Kind::Text, text.sliced(at, end - at), end};
-    }
-    if (text.sliced(at + 1).startsWith(u'{')) {
-        return {Piece::Kind::Text, text.sliced(at, 1), at + 2};
-    }
-    const qsizetype end = text.indexOf(u'}', at);
-    if (end < 0) {
-        return {Piece::Kind::Unended, text.sliced(at), text.size()};
-    }
-    return {Piece::Kind::Placeholder, text.sliced(at + 1, end - at - 1), end + 1};
-}
-
-QString inBraces(const QString &name)
-{
-    return u'{' + name + u'}';
-}
 
 } // namespace
 
@@ -79,18 +41,16 @@ std::optional<QString> Placeholders::wrongIn(QStringView text)
 {
     const QStringList known = names();
     for (qsizetype at = 0; at < text.size();) {
-        const Piece piece = pieceAt(text, at);
-        if (piece.kind == Piece::Kind::Unended) {
-            return Xlate("\"%1\" begins a placeholder that does not end: \"}\" was expected, or \"{{\" for a brace")
-                .arg(piece.text.left(longestQuote));
+        const PlaceholderPiece piece = placeholderPieceAt(text, at);
+        if (piece.kind == Kind::Unended) {
+            return unendedPlaceholder(piece.text);
         }
-        if (piece.kind == Piece::Kind::Placeholder && !known.contains(piece.text)) {
+        if (piece.kind == Kind::Placeholder && !known.contains(piece.text)) {
             QStringList braced;
             for (const QString &name : known) {
                 braced.append(inBraces(name));
             }
-            const QString name = inBraces(piece.text.left(longestQuote).toString());
-            return Xlate("unknown placeholder %1: %2").arg(name, oneOfExpected(name, braced));
+            return unknownPlaceholder(piece.text, braced);
         }
         at = piece.end;
     }
@@ -122,12 +82,12 @@ QString Placeholders::withValues(QStringView text, const QString &templateTitle,
 {
     QString done;
     for (qsizetype at = 0; at < text.size();) {
-        const Piece piece = pieceAt(text, at);
+        const PlaceholderPiece piece = placeholderPieceAt(text, at);
         const auto value =
-            piece.kind == Piece::Kind::Placeholder ? valueOf(piece.text, templateTitle, pageMarks) : std::nullopt;
+            piece.kind == Kind::Placeholder ? valueOf(piece.text, templateTitle, pageMarks) : std::nullopt;
         if (value) {
             done += *value;
-        } else if (piece.kind == Piece::Kind::Placeholder) {
+        } else if (piece.kind == Kind::Placeholder) {
             done += text.sliced(at, piece.end - at);
         } else {
             done += piece.text;

@@ -1,11 +1,19 @@
 #include "ReportMargins.h"
 
 #include "LeadingInteger.h"
+#include "Profile.h"
 
 #include <QStringList>
 
 namespace kareport
 {
+
+namespace
+{
+
+const QString profileEntry = QStringLiteral("Report Margins");
+
+} // namespace
 
 QString marginsToText(const QMargins &margins)
 {
@@ -32,6 +40,17 @@ QMargins marginsFromText(const QString &text, QMargins margins)
         (margins.*set)(leadingInteger(pieces[next++]));
     }
     return margins;
+}
+
+std::optional<QMargins> profileMargins(const QMargins &missing)
+{
+    const QString kept = GetProfileString(QString(), profileEntry);
+    return kept.isEmpty() ? std::nullopt : std::optional(marginsFromText(kept, missing));
+}
+
+void setProfileMargins(const QMargins &margins)
+{
+    WriteProfileString(QString(), profileEntry, marginsToText(margins));
 }
 
 } // namespace kareport

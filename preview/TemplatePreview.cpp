@@ -2,6 +2,8 @@
 
 #include "JobRunner.h"
 #include "SampleJob.h"
+#include "StandardInput.h"
+#include "StandardText.h"
 #include "TemplateSource.h"
 #include "TextFolding.h"
 #include "UXmlReportTpl.h"
@@ -125,7 +127,7 @@ std::optional<InputError> TemplatePreview::useJob(const Expected<JsonSource> &so
     }
     for (const Job::DataSet &set : known.data) {
         if (set.source->readsStandardInput()) {
-            return read.errorAt(place, Xlate("a window has no standard input: a file was expected"));
+            return read.errorAt(place, noStandardInputText());
         }
     }
     openings_ = openings();
@@ -261,7 +263,7 @@ PreviewResult TemplatePreview::make(const QString &text, const QByteArray &bytes
         result.wrong = makePages(text, bytes, name, report, isStopped, outline, result.pages);
     } catch (const std::bad_alloc &) {
         result.pages.reset();
-        result.wrong = InputError{path_, std::nullopt, Xlate("There is not enough memory for this input.")};
+        result.wrong = InputError{path_, std::nullopt, noMemoryText()};
     }
     result.isStopped = !result.pages && !result.wrong;
     return result;

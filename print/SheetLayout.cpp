@@ -1,5 +1,7 @@
 #include "SheetLayout.h"
 
+#include "PageUnits.h"
+
 #include <QElapsedTimer>
 #include <QPainter>
 #include <QTextBlock>
@@ -17,10 +19,9 @@ namespace
 /// Measures as a printer of a resolution does.
 QImage deviceOf(int resolution)
 {
-    constexpr double inch = 0.0254; // metres
     QImage device(1, 1, QImage::Format_RGB32);
-    device.setDotsPerMeterX(qRound(resolution / inch));
-    device.setDotsPerMeterY(qRound(resolution / inch));
+    device.setDotsPerMeterX(qRound(resolution / metresPerInch));
+    device.setDotsPerMeterY(qRound(resolution / metresPerInch));
     return device;
 }
 

@@ -49,4 +49,14 @@ void sayNotSaved(const QString &path, const QString &reason)
                       : Xlate("\"%1\" could not be saved: %2.").arg(path, reason));
 }
 
+QString lostTextReason()
+{
+    return Xlate("a part of the report was lost when memory ran out");
+}
+
+QString emptyPdfReason()
+{
+    return Xlate("the report is empty, and a PDF has at least one page");
+}
+
 } // namespace kareport

@@ -26,4 +26,9 @@ std::optional<QString> askReportName(UDocument &document, bool richTextFirst);
 /// Says in a message that a report could not be saved, and why, for a host that wants it. @param reason  empty when it is not known: what to do is said then
 void sayNotSaved(const QString &path, const QString &reason);
 
+/// Why a report that has lost text is not saved, as the end of a sentence: half of a report would replace a whole one.
+QString lostTextReason();
+/// Why an empty report becomes no PDF, as the end of a sentence.
+QString emptyPdfReason();
+
 } // namespace kareport

@@ -22,7 +22,9 @@ namespace
 /// The most of a file's first line that is looked at to tell what it is.
 constexpr qint64 longestProbe = qint64(64) * 1024;
 
-/// Whether a file may be rich text by its name.
+/// Whether a file may be rich text by its name. Opening looks for ".rtf" anywhere after the first character, and saving only at
+/// the end of the name (`kareport::isRichTextName`). The difference is intended: a file such as "a.rtf.rep" may hold rich text, so
+/// its content decides, but a report that is saved under that name is saved as text.
 bool namesRichText(const QString &path)
 {
     return path.indexOf(u".rtf", 0, Qt::CaseInsensitive) > 0;

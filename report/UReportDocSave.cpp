@@ -80,7 +80,7 @@ bool saveByName(UReportDoc &report, const QString &path, QString &problem)
 {
     if (report.HasLostText()) {
         // It would replace a whole report by half of one, or what was lost by nothing.
-        problem = Xlate("a part of the report was lost when memory ran out");
+        problem = kareport::lostTextReason();
         return false;
     }
     kareport::finishLoading(report);

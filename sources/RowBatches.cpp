@@ -1,6 +1,6 @@
 #include "RowBatches.h"
 
-#include "Xlate.h"
+#include "StandardText.h"
 
 #include <chrono>
 #include <new>
@@ -17,9 +17,7 @@ constexpr std::chrono::milliseconds pollTime(50);
 } // namespace
 
 RowBatches::RowBatches(std::function<void(RowBatch &)> fill, std::function<void()> poll)
-    : fill_(std::move(fill)),
-      poll_(std::move(poll)),
-      noMemory_{QString(), std::nullopt, Xlate("there is not enough memory for the data")}
+    : fill_(std::move(fill)), poll_(std::move(poll)), noMemory_{QString(), std::nullopt, noMemoryText()}
 {}
 
 RowBatches::~RowBatches()

@@ -99,6 +99,15 @@ private:
     bool hasMark_ = false;
 };
 
+constexpr struct
+{
+    QStringView key;
+    TextEncoding encoding;
+} encodingKeys[] = {{u"utf-8", TextEncoding::Utf8},
+                    {u"latin-1", TextEncoding::Latin1},
+                    {u"windows-1252", TextEncoding::Windows1252},
+                    {u"utf-16", TextEncoding::Utf16}};
+
 QString wrongCharacter(TextEncoding encoding)
 {
     return encoding == TextEncoding::Utf16
@@ -108,20 +117,20 @@ QString wrongCharacter(TextEncoding encoding)
 
 } // namespace
 
+QStringList textEncodingKeys()
+{
+    QStringList keys;
+    for (const auto &row : encodingKeys) {
+        keys.append(row.key.toString());
+    }
+    return keys;
+}
+
 std::optional<TextEncoding> textEncodingFromKey(QStringView key)
 {
-    struct Key
-    {
-        QStringView name;
-        TextEncoding encoding;
-    };
-    constexpr Key keys[] = {{u"utf-8", TextEncoding::Utf8},
-                            {u"latin-1", TextEncoding::Latin1},
-                            {u"windows-1252", TextEncoding::Windows1252},
-                            {u"utf-16", TextEncoding::Utf16}};
-    const auto *found =
-        std::find_if(std::begin(keys), std::end(keys), [key](const Key &one) { return one.name == key; });
-    return found != std::end(keys) ? std::optional(found->encoding) : std::nullopt;
+    const auto *found = std::find_if(std::begin(encodingKeys), std::end(encodingKeys),
+                                     [key](const auto &row) { return row.key == key; });
+    return found != std::end(encodingKeys) ? std::optional(found->encoding) : std::nullopt;
 }
 
 Expected<std::shared_ptr<const FileBytes>> toUtf8(std::shared_ptr<const FileBytes> file, TextEncoding encoding,

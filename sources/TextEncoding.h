@@ -3,6 +3,7 @@
 #include "FileBytes.h"
 #include "InputError.h"
 
+#include <QStringList>
 #include <QStringView>
 
 #include <functional>
@@ -21,7 +22,9 @@ enum class TextEncoding
     Utf16 ///< with a byte-order mark, which says the order of the bytes
 };
 
-/// The encoding of a key such as "utf-8", "latin-1", "windows-1252" or "utf-16"; nothing for any other text. Case matters.
+/// The keys of all encodings, such as "utf-8", the usual one first.
+QStringList textEncodingKeys();
+/// The encoding of one of these keys; nothing for any other text. Case matters.
 std::optional<TextEncoding> textEncodingFromKey(QStringView key);
 
 /// The bytes of a text file as UTF-8; lines and columns are the same. A text that is UTF-8 already is handed back as it is; its

@@ -1,3 +1,4 @@
+#include "PageUnits.h"
 #include "ReportEdit.h"
 
 #include "Characters.h"
@@ -71,10 +72,9 @@ void ReportEdit::applyZoom()
     if (zoom_ == 100) {
         layout->setPaintDevice(nullptr);
     } else {
-        constexpr double inch = 0.0254; // metres
         zoomDevice_ = QImage(1, 1, QImage::Format_RGB32);
-        zoomDevice_.setDotsPerMeterX(qRound(logicalDpiX() * zoom_ / 100.0 / inch));
-        zoomDevice_.setDotsPerMeterY(qRound(logicalDpiY() * zoom_ / 100.0 / inch));
+        zoomDevice_.setDotsPerMeterX(qRound(logicalDpiX() * zoom_ / 100.0 / kareport::metresPerInch));
+        zoomDevice_.setDotsPerMeterY(qRound(logicalDpiY() * zoom_ / 100.0 / kareport::metresPerInch));
         layout->setPaintDevice(&zoomDevice_);
     }
     if (wasZoomed || zoom_ != 100) {

@@ -1,3 +1,4 @@
+#include "ChangedFile.h"
 #include "DeskFrame.h"
 
 #include "AppMessageBox.h"
@@ -266,13 +267,7 @@ void DeskFrame::fileChanged(const QString &path)
         if (document == nullptr || document->GetPathName() != path) {
             continue;
         }
-        const QString question = document->IsModified()
-                                     ? Xlate("\"%1\" was changed by another program, and it has unsaved changes here. "
-                                             "Load it again and lose the changes made here?")
-                                     : Xlate("\"%1\" was changed by another program. Load it again?");
-        const MessageAnswer answer = kareport::showMessage(
-            {question.arg(path), QString(), MessageButtons::YesNo, kareport::MessageIcon::Question});
-        if (answer == MessageAnswer::Yes && UApplication::Get()->IsOpen(document)) {
+        if (kareport::askToLoadAgain(path, document->IsModified()) && UApplication::Get()->IsOpen(document)) {
             loadAgain(*document);
         }
         return;

@@ -19,7 +19,6 @@ namespace
 {
 
 const QString settingsEntry = QStringLiteral("Job Settings");
-const QString marginsEntry = QStringLiteral("Report Margins");
 const QString keepEntry = QStringLiteral("KeepReportForEditor");
 const QString paperEntry = QStringLiteral("Paper");
 const QString unitEntry = QStringLiteral("Unit of Margins");
@@ -75,7 +74,7 @@ DeskPreferences loadPreferences()
     DeskPreferences preferences;
     preferences.settings = settingsFromText(GetProfileString(QString(), settingsEntry));
     preferences.fontSize = GetReportFontSize();
-    preferences.margins = marginsFromText(GetProfileString(QString(), marginsEntry), defaultMargins);
+    preferences.margins = profileMargins(defaultMargins).value_or(defaultMargins);
     preferences.portrait = IsReportPrinterSetToPortrait();
     preferences.paper = paperOf(GetProfileString(QString(), paperEntry));
     const QString unit = GetProfileString(QString(), unitEntry);
@@ -100,7 +99,7 @@ void savePreferences(const DeskPreferences &preferences)
         QString(), settingsEntry,
         QString::fromUtf8(QJsonDocument(settingsToJson(preferences.settings)).toJson(QJsonDocument::Compact)));
     SetReportFontSize(preferences.fontSize);
-    WriteProfileString(QString(), marginsEntry, marginsToText(preferences.margins));
+    setProfileMargins(preferences.margins);
     SetReportPrinterSetToPortrait(preferences.portrait);
     WriteProfileString(QString(), paperEntry,
                        preferences.paper.isEmpty() ? QString() : QPageSize(preferences.paper).key());

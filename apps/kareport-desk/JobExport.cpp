@@ -7,17 +7,12 @@
 #include "JobOutputs.h"
 #include "JobReader.h"
 #include "JobRunner.h"
-#include "ReportTextWriter.h"
 #include "ResultOutputs.h"
-#include "SizeLimit.h"
 #include "UReportDoc.h"
 #include "Xlate.h"
 
 #include <QFile>
 #include <QFileInfo>
-
-#include <limits>
-#include <new>
 
 namespace kareport
 {
@@ -46,7 +41,7 @@ QString wrongPage(const std::vector<Output> &pages)
                                                HtmlResult::isPage(file.read(longestHead),
                                                                   QFileInfo(pages.front().file).fileName(), i + 1));
         if (!isOurs) {
-            return Xlate("\"%1\" already exists and is not a page of \"%2\": another name was expected")
+            return Xlate("\"%1\" already exists and is not a page of \"%2\": choose another name")
                 .arg(pages[i].file, pages.front().file);
         }
     }
@@ -59,9 +54,8 @@ QString writeExport(const Job &job, const JsonSource &source, Progress &progress
     ResultOutputs results(job);
     JobRunner runner(job, source, progress);
     runner.setResults(&results);
-    SizeLimit nowhere(nullptr, std::numeric_limits<qint64>::max());
-    ReportTextWriter noText(nowhere, LineEnds::PlainText);
-    const auto wrong = runner.run(report, ResultOutputs::isTextUnwanted(job) ? &noText : nullptr);
+    runner.discardUnwantedText();
+    const auto wrong = runner.run(report);
     progress.finish();
     if (wrong || isInterrupted()) {
         return wrong ? wrong->message() : QString();

@@ -4,7 +4,9 @@
 #include "Clock.h"
 #include "FileIdentity.h"
 #include "JobOutputs.h"
+#include "ReportSaveName.h"
 #include "ReportViews.h"
+#include "StandardText.h"
 #include "UReportDoc.h"
 #include "WaitCursor.h"
 #include "Xlate.h"
@@ -49,7 +51,7 @@ QString exportReport(UReportDoc &report, const SaveChoice &choice, QStringList &
 {
     try {
         if (report.HasLostText()) {
-            return Xlate("a part of the report was lost when memory ran out");
+            return lostTextReason();
         }
         if (!report.GetPathName().isEmpty() && fileIdentity(report.GetPathName()) == fileIdentity(choice.path)) {
             return Xlate("it is the report's own file, which is written by Save");
@@ -63,7 +65,7 @@ QString exportReport(UReportDoc &report, const SaveChoice &choice, QStringList &
             output.kind = OutputKind::Text;
         }
         if (output.kind == OutputKind::Pdf && makesNoPage(report)) {
-            return Xlate("the report is empty, and a PDF has at least one page");
+            return emptyPdfReason();
         }
         if (choice.hasOutline) {
             auto details = std::make_shared<PdfDetails>();
@@ -77,7 +79,7 @@ QString exportReport(UReportDoc &report, const SaveChoice &choice, QStringList &
         warnings = result.warnings;
         return result.problem.value_or(QString());
     } catch (const std::bad_alloc &) {
-        return Xlate("There is not enough memory for this input.");
+        return noMemoryText();
     }
 }
 

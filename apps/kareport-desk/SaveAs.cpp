@@ -139,9 +139,9 @@ void exportPdf(const UReportDoc &report, const SaveChoice &choice)
     QString problem;
     bool isWritten = false;
     if (report.HasLostText()) {
-        problem = Xlate("a part of the report was lost when memory ran out");
+        problem = lostTextReason();
     } else if (makesNoPage(report)) {
-        problem = Xlate("the report is empty, and a PDF has at least one page");
+        problem = emptyPdfReason();
     } else {
         const WaitCursor cursor;
         finishLoading(report);

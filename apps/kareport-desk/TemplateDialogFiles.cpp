@@ -1,3 +1,4 @@
+#include "StandardText.h"
 #include "TemplateDialog.h"
 
 #include "DictionaryVariables.h"
@@ -122,18 +123,18 @@ void TemplateDialog::readData()
 bool TemplateDialog::readContents(const std::shared_ptr<const FileBytes> &file)
 {
     const auto read = std::make_shared<Expected<LandXmlContents>>();
-    const bool isDone = doAside(
-        Xlate("Reading %1").arg(QFileInfo(file->path()).fileName()), UserInput::Kept, [file, read](AsideState &state) {
-            const std::size_t size = std::max<std::size_t>(1, file->view().size());
-            try {
-                *read = readLandXmlContents(file, [&](std::size_t done) {
-                    state.setPercent(static_cast<int>(done * 100 / size));
-                    return !state.isStopped();
-                });
-            } catch (const std::bad_alloc &) {
-                *read = InputError{file->path(), std::nullopt, Xlate("there is not enough memory for it")};
-            }
-        });
+    const bool isDone = doAside(Xlate("Reading %1").arg(QFileInfo(file->path()).fileName()), UserInput::Kept,
+                                [file, read](AsideState &state) {
+                                    const std::size_t size = std::max<std::size_t>(1, file->view().size());
+                                    try {
+                                        *read = readLandXmlContents(file, [&](std::size_t done) {
+                                            state.setPercent(static_cast<int>(done * 100 / size));
+                                            return !state.isStopped();
+                                        });
+                                    } catch (const std::bad_alloc &) {
+                                        *read = InputError{file->path(), std::nullopt, noMemoryText()};
+                                    }
+                                });
     if (!isDone) {
         wrongData_ = Xlate("The data file was not read to its end.");
         return false;

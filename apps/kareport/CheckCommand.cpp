@@ -6,7 +6,9 @@
 #include "FileKind.h"
 #include "Interrupt.h"
 #include "JobCheck.h"
+#include "JobFiles.h"
 #include "NotesFile.h"
+#include "StandardText.h"
 #include "TerminalProgress.h"
 #include "Xlate.h"
 
@@ -28,7 +30,7 @@ CheckedFile noMemoryFor(const QString &file)
 {
     CheckedFile checked;
     checked.file = file;
-    checked.add(true, {file, std::nullopt, Xlate("there is not enough memory for this file")});
+    checked.add(true, {file, std::nullopt, noMemoryText()});
     return checked;
 }
 
@@ -49,12 +51,10 @@ QStringList jobsOf(const CheckCommand &command)
 /// What of the files that are checked the notes would replace, or which notes others.
 std::optional<QString> notesClash(const CheckCommand &command, const QStringList &jobs)
 {
-    QHash<QString, QString> taken;
+    QHash<QString, QString (*)(const QString &)> taken;
     for (const QString &file : command.files) {
         if (file != u"-") {
-            taken.insert(fileIdentity(file),
-                         jobs.contains(file) ? Xlate("\"%1\" is the job itself: another file was expected")
-                                             : Xlate("\"%1\" is the template of the job: another file was expected"));
+            taken.insert(fileIdentity(file), jobs.contains(file) ? clashWithJob : clashWithTemplate);
         }
     }
     for (const QString &job : jobs) {
@@ -64,9 +64,9 @@ std::optional<QString> notesClash(const CheckCommand &command, const QStringList
             continue;
         }
         if (const auto clash = taken.constFind(identity); clash != taken.constEnd()) {
-            return clash->arg(notes, notes);
+            return clash.value()(notes);
         }
-        taken.insert(identity, Xlate("\"%1\" is the file of the output \"%2\" already: another file was expected"));
+        taken.insert(identity, [](const QString &file) { return clashWithOutput(file, file); });
     }
     return std::nullopt;
 }

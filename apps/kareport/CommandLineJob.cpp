@@ -15,7 +15,6 @@
 #include "Xlate.h"
 
 #include <algorithm>
-#include <limits>
 #include <new>
 
 namespace kareport
@@ -170,6 +169,7 @@ ExitStatus CommandLineJob::run(Progress &progress)
     ResultOutputs results(job_);
     if (!results.isEmpty()) {
         runner.setResults(&results);
+        runner.discardUnwantedText();
     }
     const Output *streamed = streamedOutput(job_);
     const auto files = std::count_if(job_.outputs.begin(), job_.outputs.end(),
@@ -181,10 +181,7 @@ ExitStatus CommandLineJob::run(Progress &progress)
             return status_ = withNotes(*status);
         }
     }
-    // Where no output needs the text, it is not kept.
-    SizeLimit nowhere(nullptr, std::numeric_limits<qint64>::max());
-    ReportTextWriter noText(nowhere, LineEnds::PlainText);
-    const auto error = make(runner, report, ResultOutputs::isTextUnwanted(job_) ? &noText : nullptr);
+    const auto error = make(runner, report, nullptr);
     progress.finish();
     status_ = madeStatus(report, error);
     if (status_ == exitDone) {

@@ -2,6 +2,7 @@
 
 #include "OutputKind.h"
 #include "SetKeys.h"
+#include "TextEncoding.h"
 
 #include <algorithm>
 
@@ -38,7 +39,7 @@ QStringList fixedValuesOf(ArgumentKind kind)
     case ArgumentKind::PageKey: return setKeys(QStringLiteral("page."));
     case ArgumentKind::Delimiter: return listOf("auto tab whitespace");
     case ArgumentKind::Decimal: return listOf(". ,");
-    case ArgumentKind::Encoding: return listOf("utf-8 latin-1 windows-1252 utf-16");
+    case ArgumentKind::Encoding: return textEncodingKeys();
     case ArgumentKind::Shell: return listOf("bash zsh fish");
     default: return {};
     }

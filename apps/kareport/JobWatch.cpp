@@ -5,6 +5,7 @@
 #include "JobFiles.h"
 #include "Progress.h"
 #include "Signals.h"
+#include "StandardText.h"
 #include "Xlate.h"
 
 #include <QCoreApplication>
@@ -114,8 +115,7 @@ ExitStatus JobWatch::make()
     try {
         status = makeOnce();
     } catch (const std::bad_alloc &) {
-        printError(InputError{command_.jobs.first(), std::nullopt, Xlate("there is not enough memory for this job")}
-                       .message());
+        printError(InputError{command_.jobs.first(), std::nullopt, noMemoryText()}.message());
     }
     watchFiles();
     return status;

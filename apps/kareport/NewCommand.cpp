@@ -87,8 +87,7 @@ ExitStatus NewCommand::run() const
     const bool isMade = !isThere(folder);
     // The folder itself is what was asked for; those that it is in are not.
     if (const QString missing = missingFolder(QDir::cleanPath(folder)); !missing.isEmpty() && !parents) {
-        return fail(Xlate("\"%1\" could not be created: %2")
-                        .arg(folder, Xlate("there is no folder \"%1\"; --parents creates it").arg(missing)));
+        return fail(Xlate("\"%1\" could not be created: %2").arg(folder, noFolderText(missing)));
     }
     if (const auto reason = QFileInfo(folder).isDir() ? std::nullopt : makeFolders(folder)) {
         return fail(Xlate("\"%1\" could not be created: %2").arg(folder, *reason));

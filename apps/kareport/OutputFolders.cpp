@@ -49,6 +49,11 @@ QString missingFolder(const QString &file)
     return missing;
 }
 
+QString noFolderText(const QString &folder)
+{
+    return Xlate("there is no folder \"%1\"; --parents creates it").arg(folder);
+}
+
 std::optional<QString> makeFolders(const QString &folder)
 {
     std::error_code error;
@@ -70,7 +75,7 @@ std::optional<QString> OutputFolders::whyNotWritten(const QString &file) const
         return std::nullopt;
     }
     if (!areMade_) {
-        return Xlate("there is no folder \"%1\"; --parents creates it").arg(missing);
+        return noFolderText(missing);
     }
     return Xlate("the folder \"%1\" could not be created: %2").arg(missing, makeFolders(missing).value_or(QString()));
 }

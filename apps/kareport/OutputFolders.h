@@ -10,6 +10,9 @@ namespace kareport
 /// The first folder on the way to a file that is not there; empty when all are, or a file is in its place.
 QString missingFolder(const QString &file);
 
+/// Says that a folder is missing, and which option creates it.
+QString noFolderText(const QString &folder);
+
 /// Makes a folder and those that it is in. @return the system's reason when that is not possible
 std::optional<QString> makeFolders(const QString &folder);
 

@@ -3,6 +3,7 @@
 #include "FileIdentity.h"
 #include "Interrupt.h"
 #include "JobFiles.h"
+#include "StandardText.h"
 #include "Xlate.h"
 
 #include <algorithm>
@@ -37,7 +38,7 @@ ExitStatus RenderBatch::run(const QStringList &jobs)
         try {
             status = make(jobs[i]);
         } catch (const std::bad_alloc &) {
-            printError(InputError{jobs[i], std::nullopt, Xlate("there is not enough memory for this job")}.message());
+            printError(InputError{jobs[i], std::nullopt, noMemoryText()}.message());
         }
         failed_ += status == exitDone || status == exitInterrupted ? 0 : 1;
         worst = std::max(worst, status);

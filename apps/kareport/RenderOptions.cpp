@@ -1,5 +1,7 @@
 #include "CommandOptions.h"
 
+#include "TextEncoding.h"
+
 namespace kareport
 {
 
@@ -14,7 +16,7 @@ std::optional<QString> textIfAny(const std::optional<std::string> &word)
 void addDataOptions(CLI::App &render, DataWords &words, ArgumentKinds &kinds)
 {
     const char *group = "Data of --data";
-    const auto add = [&](ArgumentKind kind, const char *name, auto &value, const char *type, const char *text) {
+    const auto add = [&](ArgumentKind kind, const char *name, auto &value, const char *type, const std::string &text) {
         return kinds.note(kind, render.add_option(name, value, text))->type_name(type)->group(group);
     };
     add(ArgumentKind::Delimiter, "--delimiter", words.delimiter, "CHAR",
@@ -28,7 +30,8 @@ void addDataOptions(CLI::App &render, DataWords &words, ArgumentKinds &kinds)
         ->allow_extra_args(false);
     add(ArgumentKind::Decimal, "--decimal", words.decimal, "CHAR", "Decimal sign of the numbers, . or ,");
     add(ArgumentKind::Text, "--thousands", words.thousands, "CHAR", "Separator of groups of three digits");
-    add(ArgumentKind::Encoding, "--encoding", words.encoding, "NAME", "utf-8, latin-1, windows-1252 or utf-16");
+    add(ArgumentKind::Encoding, "--encoding", words.encoding, "NAME",
+        ("One of " + textEncodingKeys().join(QStringLiteral(", "))).toStdString());
     add(ArgumentKind::Text, "--comment", words.comment, "CHAR", "Skip lines that begin with this character");
     add(ArgumentKind::Text, "--skip", words.skip, "N", "Skip this many lines at the beginning");
     render.add_flag("--no-header", words.hasNoHeader, "The first row is data already")->group(group);

@@ -119,7 +119,7 @@ void visibleLine(QLatin1StringView line, QString &visible)
 
 std::u32string visibleCharacters(QStringView text)
 {
-    Seen seen{std::vector<char>(0x10000), {}};
+    Seen seen{std::vector<char>(planeSize), {}};
     for (qsizetype i = 0; i < text.size(); ++i) {
         const QChar character = text[i];
         if (!character.isSurrogate()) {

@@ -2,6 +2,7 @@
 
 #include "MemoryLasts.h"
 
+#include <algorithm>
 #include <cstddef>
 #include <iterator>
 #include <utility>
@@ -12,19 +13,15 @@ namespace kareport
 namespace
 {
 
-const QString placeholder = QStringLiteral("RTF Data");
-
-/// The document that a style's template is cut from.
-const QString sources[] = {
-    QStringLiteral("{\\rtf1\\ansi\\ansicpg1252\\deff0\\deflang1033{\\fonttbl{\\f1\\fnil\\fcharset0 Lucida Console;}}"
-                   "\\viewkind4\\uc1\\pard\\f1\\fs18 <<RTF Data>> }"),
-    QStringLiteral("{\\rtf1\\ansi\\ansicpg1252\\deff0\\deflang1033{\\fonttbl{\\f1\\fnil\\fcharset0 Lucida Console;}}"
-                   "\\viewkind4\\uc1\\pard\\b\\f1\\fs18 <<RTF Data>>\\b0 }"),
-    QStringLiteral("{\\rtf1\\ansi\\ansicpg1252\\deff0\\deflang1033{\\fonttbl{\\f1\\fnil\\fcharset0 Lucida Console;}}"
-                   "\\viewkind4\\uc1\\pard\\ul\\f1\\fs18 <<RTF Data>>\\ulnone }"),
-    QStringLiteral("{\\rtf1\\ansi\\ansicpg1252\\deff0\\deflang1033{\\fonttbl{\\f1\\fnil\\fcharset0 Lucida Console;}}"
-                   "\\viewkind4\\uc1\\pard\\ul\\b\\f1\\fs18 <<RTF Data>>\\ulnone\\b0 }"),
-};
+/// What comes before and after a text of each style. The face is that of the document's font table.
+constexpr struct
+{
+    QStringView before;
+    QStringView after;
+} styles[] = {{u"\\viewkind4\\uc1\\pard\\f1\\fs18 ", u" "},
+              {u"\\viewkind4\\uc1\\pard\\b\\f1\\fs18 ", u"\\b0 "},
+              {u"\\viewkind4\\uc1\\pard\\ul\\f1\\fs18 ", u"\\ulnone "},
+              {u"\\viewkind4\\uc1\\pard\\ul\\b\\f1\\fs18 ", u"\\ulnone\\b0 "}};
 
 } // namespace
 
@@ -51,15 +48,11 @@ QString RichTextImage::fontTable(const QString &fontName, unsigned fontSize)
 void RichTextImage::setOn(bool on)
 {
     if (on) {
-        const QString key = QStringLiteral("<<%1>>").arg(placeholder);
         decltype(templates_) made; // all of them or none
-        static_assert(std::size(sources) == std::tuple_size_v<decltype(made)>, "each style has a source");
-        for (std::size_t style = 0; style < made.size(); ++style) {
-            QString paragraph = sources[style];
-            cutToParagraph(paragraph);
-            const qsizetype at = paragraph.indexOf(key);
-            made[style] = {paragraph.first(at), paragraph.sliced(at + key.size())};
-        }
+        static_assert(std::size(styles) == std::tuple_size_v<decltype(made)>, "each style has a template");
+        std::transform(std::begin(styles), std::end(styles), made.begin(), [](const auto &style) {
+            return ParagraphTemplate{style.before.toString(), style.after.toString()};
+        });
         templates_ = std::move(made);
     }
     on_ = on;

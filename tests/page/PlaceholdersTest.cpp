@@ -71,6 +71,8 @@ TEST(Placeholders, WhatIsWrongIsSaidWithWhatWouldBeRight)
         {"{page} {wholly}", "unknown placeholder {wholly}: " + all, "nothing is near"},
         {"{}", "unknown placeholder {}: " + all, "no name"},
         {"a {b", "\"{b\" begins a placeholder that does not end: \"}\" was expected, or \"{{\" for a brace", "no end"},
+        {"{a placeholder that is longer than a message may be}",
+         "unknown placeholder {a placeholder that is longer than a mess…}: " + all, "a long name is cut short"},
     };
     for (const auto &row : rows) {
         const auto wrong = Placeholders::wrongIn(QString::fromUtf8(row.text));

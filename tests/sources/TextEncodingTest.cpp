@@ -33,6 +33,15 @@ TEST(TextEncoding, HasAKey)
     }
 }
 
+TEST(TextEncoding, EveryKeyIsListedOnce)
+{
+    const QStringList keys = kareport::textEncodingKeys();
+    EXPECT_EQ(keys.join(u' ').toStdString(), "utf-8 latin-1 windows-1252 utf-16");
+    for (const QString &key : keys) {
+        EXPECT_TRUE(kareport::textEncodingFromKey(key)) << key.toStdString();
+    }
+}
+
 TEST(TextEncoding, EveryEncodingReads)
 {
     const QString text = QStringLiteral("Number,Description\n1,Größe €\n2,𝄞測\n");

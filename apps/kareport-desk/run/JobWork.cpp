@@ -4,6 +4,7 @@
 #include "DeskPreferences.h"
 #include "Interrupt.h"
 #include "JobReader.h"
+#include "StandardInput.h"
 #include "ValueGuard.h"
 #include "Xlate.h"
 
@@ -36,7 +37,7 @@ std::optional<InputError> dataThatIsNoFile(const Job &job, const JsonSource &sou
         const Job::DataSet &set = *job.data.constFind(name);
         const JsonPath place = {QStringLiteral("data"), name, set.kind};
         if (set.source->readsStandardInput()) {
-            return source.errorAt(place, Xlate("a window has no standard input: a file was expected"));
+            return source.errorAt(place, noStandardInputText());
         }
         for (const QString &file : set.source->files()) {
             if (QFileInfo(file).exists() && !QFileInfo(file).isFile()) {

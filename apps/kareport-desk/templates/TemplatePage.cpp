@@ -1,6 +1,7 @@
 #include "TemplatePage.h"
 
 #include "FixedPitchFont.h"
+#include "PageDefaults.h"
 #include "TemplateHighlighter.h"
 #include "Xlate.h"
 
@@ -43,7 +44,7 @@ TemplatePage::TemplatePage(QWidget *parent) : QPlainTextEdit(parent)
 {
     setAccessibleName(Xlate("First pages of the report"));
     setAccessibleDescription(Xlate("Enter on a value or a label goes to its field in the template."));
-    setFont(fixedPitchFont(QStringLiteral("Lucida Console")));
+    setFont(fixedPitchFont(defaultFace.toString()));
     setReadOnly(true);
     setTextInteractionFlags(Qt::TextSelectableByMouse | Qt::TextSelectableByKeyboard);
     setLineWrapMode(QPlainTextEdit::NoWrap);

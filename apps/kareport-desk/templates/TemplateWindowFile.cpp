@@ -1,5 +1,6 @@
 // The file of a template, and the data that its pages are made with.
 #include "AppMessageBox.h"
+#include "ChangedFile.h"
 #include "FileKind.h"
 #include "ReplaceFile.h"
 #include "TemplatePage.h"
@@ -139,13 +140,7 @@ void TemplateWindow::fileChanged(const QString &path)
     if (!file.open(QIODevice::ReadOnly) || file.readAll() == file_.bytesOf(edit_->wholeText())) {
         return;
     }
-    const QString question = edit_->document()->isModified()
-                                 ? Xlate("\"%1\" was changed by another program, and it has unsaved changes here. "
-                                         "Load it again and lose the changes made here?")
-                                 : Xlate("\"%1\" was changed by another program. Load it again?");
-    const MessageAnswer answer =
-        kareport::showMessage({question.arg(path), QString(), MessageButtons::YesNo, MessageIcon::Question});
-    if (answer != MessageAnswer::Yes) {
+    if (!askToLoadAgain(path, edit_->document()->isModified())) {
         edit_->document()->setModified(true); // what is shown is not in the file
         return;
     }
