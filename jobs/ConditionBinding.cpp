@@ -16,7 +16,8 @@ void bindLimit(RowCondition &bound, const TableShape::Condition &condition, cons
                VariableLookup &lookup)
 {
     if (!isNumeric(of.type)) {
-        lookup.fail(condition.of.path, Xlate("the values of the variable \"%1\" are not numbers").arg(of.name));
+        lookup.fail(condition.of.path,
+                    Xlate("the variable \"%1\" does not hold numbers: a numeric variable was expected").arg(of.name));
         return;
     }
     const auto limit = lookup.valueOf(of, condition.values.front());

@@ -50,7 +50,7 @@ std::optional<Measure> formulaMeasure(RowFormula::Kind kind, const std::vector<F
 QString noFit(const FoundVariable &target)
 {
     return Xlate(
-               "the variable \"%1\" cannot take that: one of the same measure was expected, such as a length for lengths")
+               "the variable \"%1\" does not fit the result: a variable of the same measure was expected, such as a length for lengths")
         .arg(target.name);
 }
 
@@ -61,9 +61,11 @@ std::optional<RowFormula> bindFormula(const TableShape::Formula &formula, const 
     for (const TableShape::Name &name : formula.operands) {
         operands.push_back(lookup.find(name));
         if (equalFolded(name.text, formula.variable.text)) {
-            lookup.fail(name.path, Xlate("a variable cannot be computed of itself"));
+            lookup.fail(name.path, Xlate("a variable cannot be computed from itself: another variable was expected"));
         } else if (!lookup.error() && !isNumeric(operands.back().type)) {
-            lookup.fail(name.path, Xlate("the values of the variable \"%1\" are not numbers").arg(name.text));
+            lookup.fail(
+                name.path,
+                Xlate("the variable \"%1\" does not hold numbers: a numeric variable was expected").arg(name.text));
         }
         lookup.expectSet(name, operands.back());
     }
@@ -76,8 +78,10 @@ std::optional<RowFormula> bindFormula(const TableShape::Formula &formula, const 
     }
     const auto measure = formulaMeasure(bound.kind, operands);
     if (!measure || *measure == Measure::Thickness) {
-        lookup.fail(formula.path, Xlate("the variables do not go together: those of one measure were expected, such as "
-                                        "lengths, or a product of two lengths or of a number"));
+        lookup.fail(
+            formula.path,
+            Xlate(
+                "the variables cannot be combined: variables of the same measure were expected, such as lengths, or for a product two lengths or a number and another variable"));
         return std::nullopt;
     }
     const bool areWhole = std::all_of(operands.begin(), operands.end(),

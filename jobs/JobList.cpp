@@ -68,8 +68,8 @@ Expected<QStringList> readJobList(const QString &path)
     if (lastZero >= 0 && bytes.contains('\n') && !bytes.sliced(lastZero + 1).trimmed().isEmpty()) {
         return InputError{
             path == u"-" ? QString() : path, placeOfByte(bytes, bytes.indexOf('\0')),
-            Xlate("the list of jobs has lines and characters 0 as well: names on lines, or each ended by a "
-                  "character 0, were expected")};
+            Xlate(
+                "the list of jobs contains both line breaks and NUL characters: either one name per line or a NUL character after each name was expected")};
     }
     const char separator = bytes.contains('\0') ? '\0' : '\n';
     QStringList jobs;

@@ -158,7 +158,9 @@ std::optional<QString> JsonSource::set(const QString &key, const QString &text)
     const auto changed =
         steps.contains(QString()) ? std::nullopt : withValueAt(root_, steps, std::get<QJsonValue>(value));
     if (!changed) {
-        return Xlate("there is no place for the key \"%1\" in the job").arg(quoteOf(key));
+        return Xlate(
+                   "the key \"%1\" cannot be set in the job: names of keys, and numbers of existing elements of a list, were expected between the dots")
+            .arg(quoteOf(key));
     }
     root_ = *changed;
     setTexts_.removeIf([inside = key + u'.'](const auto &given) { return given.key().startsWith(inside); });

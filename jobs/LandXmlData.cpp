@@ -48,8 +48,8 @@ std::shared_ptr<const DataSource> read(const JsonNode &set, const QDir &folder)
     const JsonNode units = set[QStringLiteral("units")];
     for (const char *unused : {"area", "angle"}) {
         if (const JsonNode unit = units[QString::fromLatin1(unused)]; unit.exists()) {
-            unit.fail(
-                Xlate("the file states its units: \"length\" alone was expected, which lengths of the job are in"));
+            unit.fail(Xlate(
+                "a LandXML file states its own units: only \"length\" was expected, the unit of lengths in the job"));
         }
     }
     return std::make_shared<LandXmlData>(readDataFileName(set[QStringLiteral("landxml")], folder),

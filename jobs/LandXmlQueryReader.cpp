@@ -81,7 +81,8 @@ void expectKeysOf(const JsonNode &set, unsigned used, QStringView list)
     for (const auto &row : keys) {
         const JsonNode node = set[QString::fromLatin1(row.key)];
         if (node.exists() && (used & row.use) == 0) {
-            node.fail(Xlate("the list \"%1\" has no use for the key \"%2\"").arg(list, QString::fromLatin1(row.key)));
+            node.fail(Xlate("the list \"%1\" does not use the key \"%2\": remove the key, or choose another list")
+                          .arg(list, QString::fromLatin1(row.key)));
         }
     }
 }

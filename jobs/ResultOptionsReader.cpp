@@ -78,9 +78,8 @@ char readDelimiter(const JsonNode &node)
     const QString text = node.text();
     const bool isOne = text.size() == 1 && text[0].unicode() > 0 && text[0].unicode() < 128;
     if (!isOne || text[0].isLetterOrNumber() || QStringLiteral("\"\r\n+-. ").contains(text[0])) {
-        node.fail(
-            Xlate("one ASCII character that is not a letter, a digit, a sign, a point, a quote, a blank or a line "
-                  "end was expected"));
+        node.fail(Xlate(
+            "one ASCII character was expected, other than a letter, a digit, a sign, a point, a quote, a blank or a line end"));
         return ',';
     }
     return text[0].toLatin1();

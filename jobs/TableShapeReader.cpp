@@ -106,7 +106,7 @@ TableShape::Condition readCondition(const JsonNode &node, const QStringList &oth
     if (const JsonNode beside = node[QStringLiteral("beside")]; beside.exists()) {
         condition.beside = readName(beside);
         if (condition.kind.startsWith(u"is") || condition.kind == u"exists") {
-            beside.fail(Xlate("\"beside\" goes with above, below and outside alone"));
+            beside.fail(Xlate("\"beside\" was expected only with above, below or outside"));
         }
     }
     return condition;

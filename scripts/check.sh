@@ -15,7 +15,7 @@ Runs what is named, or all three, and installs what they need. Exit status 1 whe
   coverage   the tests, instrumented (build/coverage): the lines reached in each folder, and a page for each file in
              out/coverage
   fuzz       a minute of each fuzz target under the sanitizers (build/fuzz). New inputs stay in build/fuzz/corpus; one that
-             fails is named, and belongs in fuzz/corpus with its fix
+             fails is named, and is to be kept in fuzz/corpus once it is fixed
 
   --folder FOLDER   tidy: only this folder, as page or apps/kareport; can be given several times
   --seconds N       fuzz: seconds for each target instead of 60

@@ -244,12 +244,12 @@
         <translation>%1 wird unverändert gedruckt</translation>
     </message>
     <message>
-        <location filename="../page/Placeholders.cpp"/>
+        <location filename="../page/PlaceholderPiece.cpp"/>
         <source>"%1" begins a placeholder that does not end: "}" was expected, or "{{" for a brace</source>
         <translation>"%1" beginnt einen Platzhalter, der nicht endet: "}" wurde erwartet, oder "{{" für eine Klammer</translation>
     </message>
     <message>
-        <location filename="../page/Placeholders.cpp"/>
+        <location filename="../page/PlaceholderPiece.cpp"/>
         <source>unknown placeholder %1: %2</source>
         <translation>unbekannter Platzhalter %1: %2</translation>
     </message>
@@ -389,14 +389,19 @@
         <translation>„%1“ konnte nicht gespeichert werden: %2.</translation>
     </message>
     <message>
+        <location filename="../report/ReportSaveName.cpp"/>
+        <source>a part of the report was lost when memory ran out</source>
+        <translation>ein Teil des Berichts ging verloren, als der Speicher ausging</translation>
+    </message>
+    <message>
+        <location filename="../report/ReportSaveName.cpp"/>
+        <source>the report is empty, and a PDF has at least one page</source>
+        <translation>der Bericht ist leer, und eine PDF-Datei hat mindestens eine Seite</translation>
+    </message>
+    <message>
         <location filename="../report/UReportDoc.cpp"/>
         <source>Station</source>
         <translation>Station</translation>
-    </message>
-    <message>
-        <location filename="../report/UReportDocSave.cpp"/>
-        <source>a part of the report was lost when memory ran out</source>
-        <translation>ein Teil des Berichts ging verloren, als der Speicher ausging</translation>
     </message>
     <message>
         <location filename="../report/UReportDocText.cpp"/>
@@ -1032,11 +1037,6 @@
         <translation>eine Geometrie anderer Art</translation>
     </message>
     <message>
-        <location filename="../sources/RowBatches.cpp"/>
-        <source>there is not enough memory for the data</source>
-        <translation>der Arbeitsspeicher reicht für die Daten nicht aus</translation>
-    </message>
-    <message>
         <location filename="../sources/RowReader.cpp"/>
         <source>a row has values in several columns whose variables have one ID: that of "%1", the last one, shows</source>
         <translation>eine Zeile hat Werte in mehreren Spalten, deren Variablen eine ID haben: der von "%1", der letzten, erscheint</translation>
@@ -1193,28 +1193,28 @@
     </message>
     <message>
         <location filename="../sources/csv/CsvRowsColumns.cpp"/>
-        <source>no column of the header row is a variable of the dictionary: a header row of variable names, with the data's delimiter between them, was expected</source>
-        <translation>keine Spalte der Kopfzeile ist eine Variable des Wörterbuchs: eine Kopfzeile mit Variablennamen, dazwischen das Trennzeichen der Daten, wurde erwartet</translation>
+        <source>no column of the header row is a variable of the dictionary: variable names separated by the delimiter were expected</source>
+        <translation>keine Spalte der Kopfzeile ist eine Variable des Wörterbuchs: durch das Trennzeichen getrennte Variablennamen wurden erwartet</translation>
     </message>
     <message>
         <location filename="../sources/csv/CsvRowsColumns.cpp"/>
-        <source>no column is a variable of the dictionary: without a header row, columns with their numbers were expected, or an order such as PNEZD</source>
-        <translation>keine Spalte ist eine Variable des Wörterbuchs: ohne Kopfzeile wurden Spalten mit ihren Nummern erwartet oder eine Reihenfolge wie PNEZD</translation>
+        <source>no column is a variable of the dictionary: without a header row, column numbers or an order such as PNEZD were expected</source>
+        <translation>keine Spalte ist eine Variable des Wörterbuchs: ohne Kopfzeile wurden Spaltennummern oder eine Reihenfolge wie PNEZD erwartet</translation>
     </message>
     <message>
         <location filename="../sources/csv/CsvRowsColumns.cpp"/>
-        <source>the header row holds values that fit the columns, and would be lost if it is data: "header": false (--no-header) was expected, with "skip" for lines that are not data, or "header": true</source>
-        <translation>die Kopfzeile enthält Werte, die zu den Spalten passen, und ginge verloren, wenn sie Daten ist: "header": false (--no-header) wurde erwartet, mit "skip" für Zeilen, die keine Daten sind, oder "header": true</translation>
+        <source>the header row holds values that fit the columns, and may be data. If it is data, set "header" to false (--no-header), and use "skip" for lines that are not data; otherwise set "header" to true</source>
+        <translation>die Kopfzeile enthält Werte, die zu den Spalten passen, und kann Daten enthalten. Wenn sie Daten enthält, "header" auf false setzen (--no-header) und "skip" für Zeilen ohne Daten verwenden; sonst "header" auf true setzen</translation>
     </message>
     <message>
         <location filename="../sources/csv/CsvRowsColumns.cpp"/>
-        <source>the header row holds %1 value that fits its column, and is lost if it is data: "header" true or false was expected, which says what it is</source>
-        <translation>die Kopfzeile enthält %1 Wert, der zu seiner Spalte passt, und geht verloren, wenn sie Daten ist: "header" true oder false wurde erwartet, was sagt, was sie ist</translation>
+        <source>the header row holds %1 value that fits its column, and may be data: set "header" to true if it is a header row, or to false if it is data</source>
+        <translation>die Kopfzeile enthält %1 Wert, der zu seiner Spalte passt, und kann Daten enthalten: "header" auf true setzen, wenn sie eine Kopfzeile ist, oder auf false, wenn sie Daten enthält</translation>
     </message>
     <message>
         <location filename="../sources/csv/CsvRowsColumns.cpp"/>
-        <source>the header row holds %1 values that fit their columns, and is lost if it is data: "header" true or false was expected, which says what it is</source>
-        <translation>die Kopfzeile enthält %1 Werte, die zu ihren Spalten passen, und geht verloren, wenn sie Daten ist: "header" true oder false wurde erwartet, was sagt, was sie ist</translation>
+        <source>the header row holds %1 values that fit their columns, and may be data: set "header" to true if it is a header row, or to false if it is data</source>
+        <translation>die Kopfzeile enthält %1 Werte, die zu ihren Spalten passen, und kann Daten enthalten: "header" auf true setzen, wenn sie eine Kopfzeile ist, oder auf false, wenn sie Daten enthält</translation>
     </message>
     <message>
         <location filename="../sources/csv/DelimiterGuess.cpp"/>
@@ -1243,8 +1243,8 @@
     </message>
     <message>
         <location filename="../sources/csv/DelimiterGuess.cpp"/>
-        <source>the delimiter cannot be detected: with a comma, a semicolon, a tab, a vertical bar, or blanks and tabs, the first rows do not have the same number of cells that fit their variables. The delimiter itself was expected</source>
-        <translation>das Trennzeichen ist nicht zu ermitteln: mit Komma, Semikolon, Tabulator, senkrechtem Strich oder Leerzeichen und Tabulatoren haben die ersten Zeilen nicht gleich viele Zellen, die zu ihren Variablen passen. Das Trennzeichen selbst wurde erwartet</translation>
+        <source>the delimiter cannot be determined: with a comma, a semicolon, a tab, a vertical bar, or blanks and tabs, the first rows do not have the same number of cells that fit their variables. Specify the delimiter</source>
+        <translation>das Trennzeichen ist nicht zu ermitteln: mit Komma, Semikolon, Tabulator, senkrechtem Strich oder Leerzeichen und Tabulatoren haben die ersten Zeilen nicht gleich viele Zellen, die zu ihren Variablen passen. Geben Sie das Trennzeichen an</translation>
     </message>
     <message>
         <location filename="../sources/csv/DelimiterGuess.cpp"/>
@@ -1253,8 +1253,8 @@
     </message>
     <message>
         <location filename="../sources/csv/DelimiterGuess.cpp"/>
-        <source>the delimiter cannot be detected: it may be %1. The delimiter itself was expected</source>
-        <translation>das Trennzeichen ist nicht zu ermitteln: möglich sind %1. Das Trennzeichen selbst wurde erwartet</translation>
+        <source>the delimiter cannot be determined: it may be %1. Specify the delimiter</source>
+        <translation>das Trennzeichen ist nicht zu ermitteln: möglich sind %1. Geben Sie das Trennzeichen an</translation>
     </message>
     <message>
         <location filename="../sources/csv/DelimiterGuess.cpp"/>
@@ -1634,8 +1634,8 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlWidths.cpp"/>
-        <source>the width is not listed: staStart, a staEnd after it, startWidth and endWidth were expected</source>
-        <translation>die Breite wird nicht aufgeführt: staStart, ein staEnd dahinter, startWidth und endWidth wurden erwartet</translation>
+        <source>the width is left out: staStart, a larger staEnd, startWidth and endWidth were expected</source>
+        <translation>die Breite wird ausgelassen: staStart, ein größeres staEnd, startWidth und endWidth wurden erwartet</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlWidths.cpp"/>
@@ -1774,8 +1774,8 @@
     </message>
     <message>
         <location filename="../sources/landxml/XmlStreamCallbacks.h"/>
-        <source>the document type is in another file, "%1", which is not read: a file that needs no other was expected</source>
-        <translation>der Dokumenttyp steht in einer anderen Datei, „%1“, die nicht gelesen wird: erwartet wurde eine Datei, die keine andere braucht</translation>
+        <source>the document type is in another file, "%1", which is not read: a file without an external document type was expected</source>
+        <translation>der Dokumenttyp steht in einer anderen Datei, „%1“, die nicht gelesen wird: erwartet wurde eine Datei ohne externen Dokumenttyp</translation>
     </message>
     <message>
         <location filename="../sources/landxml/XmlStreamCallbacks.h"/>
@@ -1814,8 +1814,8 @@
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresConnection.cpp"/>
-        <source>a connection has no "%1": a password is read from the user's own password file (~/.pgpass) or from PGPASSWORD</source>
-        <translation>eine Verbindung hat kein "%1": ein Passwort wird aus der eigenen Passwortdatei des Benutzers (~/.pgpass) oder aus PGPASSWORD gelesen</translation>
+        <source>a connection cannot contain "%1": remove it, and put the password into your password file (~/.pgpass) or into PGPASSWORD</source>
+        <translation>eine Verbindung kann "%1" nicht enthalten: entfernen Sie es, und schreiben Sie das Passwort in Ihre Passwortdatei (~/.pgpass) oder in PGPASSWORD</translation>
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresConnection.cpp"/>
@@ -1869,8 +1869,8 @@
     </message>
     <message>
         <location filename="../sources/sqlite/SqliteFile.cpp"/>
-        <source>a database was expected, which is a file</source>
-        <translation>eine Datenbank wurde erwartet, also eine Datei</translation>
+        <source>a database file was expected, not a folder or a device</source>
+        <translation>eine Datenbankdatei wurde erwartet, kein Ordner und kein Gerät</translation>
     </message>
     <message>
         <location filename="../sources/sqlite/SqliteFile.cpp"/>
@@ -1894,8 +1894,8 @@
     </message>
     <message>
         <location filename="../sources/sqlite/SqliteFile.cpp"/>
-        <source>a program that wrote to the database has not ended its work: it was expected to be opened by that program first</source>
-        <translation>ein Programm, das in die Datenbank schrieb, hat seine Arbeit nicht beendet: erwartet wurde, dass dieses Programm sie zuerst öffnet</translation>
+        <source>a program that wrote to the database did not finish its work: open the database with that program first</source>
+        <translation>ein Programm, das in die Datenbank schrieb, hat seine Arbeit nicht beendet: öffnen Sie die Datenbank zuerst mit diesem Programm</translation>
     </message>
     <message>
         <location filename="../sources/sqlite/SqliteFile.cpp"/>
@@ -1979,8 +1979,8 @@
     </message>
     <message>
         <location filename="../jobs/ConditionBinding.cpp"/>
-        <source>the values of the variable "%1" are not numbers</source>
-        <translation>Werte der Variablen „%1“ sind keine Zahlen</translation>
+        <source>the variable "%1" does not hold numbers: a numeric variable was expected</source>
+        <translation>die Variable „%1“ enthält keine Zahlen: eine numerische Variable wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/ConditionBinding.cpp"/>
@@ -2019,13 +2019,13 @@
     </message>
     <message>
         <location filename="../jobs/CsvOptions.cpp"/>
-        <source>one character that is neither a digit, a letter nor a sign, and not the decimal sign, was expected</source>
-        <translation>ein Zeichen, das weder Ziffer, Buchstabe noch Vorzeichen und nicht das Dezimalzeichen ist, wurde erwartet</translation>
+        <source>one character was expected, other than a digit, a letter, a sign, a quote, a line end or the decimal sign</source>
+        <translation>erwartet wurde ein Zeichen, aber keine Ziffer, kein Buchstabe, kein Vorzeichen, kein Anführungszeichen, kein Zeilenende und nicht das Dezimalzeichen</translation>
     </message>
     <message>
         <location filename="../jobs/CsvOptions.cpp"/>
-        <source>one ASCII character that is not a letter, a digit, a sign, a quote or a line end, or one of %1, was expected</source>
-        <translation>ein ASCII-Zeichen, das kein Buchstabe, keine Ziffer, kein Vorzeichen, kein Anführungszeichen und kein Zeilenende ist, oder eines von %1 wurde erwartet</translation>
+        <source>one ASCII character was expected, other than a letter, a digit, a sign, a quote or a line end, or one of the words %1</source>
+        <translation>erwartet wurde ein ASCII-Zeichen, aber kein Buchstabe, keine Ziffer, kein Vorzeichen, kein Anführungszeichen und kein Zeilenende, oder eines der Wörter %1</translation>
     </message>
     <message>
         <location filename="../jobs/CsvOptions.cpp"/>
@@ -2039,8 +2039,8 @@
     </message>
     <message>
         <location filename="../jobs/CsvOptions.cpp"/>
-        <source>one ASCII character that is not a letter, a digit, a sign, a quote or a line end was expected</source>
-        <translation>ein ASCII-Zeichen, das kein Buchstabe, keine Ziffer, kein Vorzeichen, kein Anführungszeichen und kein Zeilenende ist, wurde erwartet</translation>
+        <source>one ASCII character was expected, other than a letter, a digit, a sign, a quote or a line end</source>
+        <translation>erwartet wurde ein ASCII-Zeichen, aber kein Buchstabe, keine Ziffer, kein Vorzeichen, kein Anführungszeichen und kein Zeilenende</translation>
     </message>
     <message>
         <location filename="../jobs/DataFiles.cpp"/>
@@ -2054,18 +2054,18 @@
     </message>
     <message>
         <location filename="../jobs/FormulaBinding.cpp"/>
-        <source>the variable "%1" cannot take that: one of the same measure was expected, such as a length for lengths</source>
-        <translation>die Variable „%1“ kann das nicht aufnehmen: eine der gleichen Größenart wurde erwartet, etwa eine Länge für Längen</translation>
+        <source>the variable "%1" does not fit the result: a variable of the same measure was expected, such as a length for lengths</source>
+        <translation>die Variable „%1“ passt nicht zum Ergebnis: eine Variable der gleichen Größenart wurde erwartet, etwa eine Länge für Längen</translation>
     </message>
     <message>
         <location filename="../jobs/FormulaBinding.cpp"/>
-        <source>a variable cannot be computed of itself</source>
-        <translation>eine Variable kann nicht aus sich selbst berechnet werden</translation>
+        <source>a variable cannot be computed from itself: another variable was expected</source>
+        <translation>eine Variable kann nicht aus sich selbst berechnet werden: eine andere Variable wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/FormulaBinding.cpp"/>
-        <source>the variables do not go together: those of one measure were expected, such as lengths, or a product of two lengths or of a number</source>
-        <translation>die Variablen passen nicht zusammen: solche einer Größenart wurden erwartet, etwa Längen, oder ein Produkt zweier Längen oder mit einer Zahl</translation>
+        <source>the variables cannot be combined: variables of the same measure were expected, such as lengths, or for a product two lengths or a number and another variable</source>
+        <translation>die Variablen lassen sich nicht verknüpfen: erwartet wurden Variablen der gleichen Größenart, etwa Längen, oder für ein Produkt zwei Längen oder eine Zahl und eine andere Variable</translation>
     </message>
     <message>
         <location filename="../jobs/GroupBinding.cpp"/>
@@ -2124,8 +2124,8 @@
     </message>
     <message>
         <location filename="../jobs/JobFiles.cpp"/>
-        <source>"%1" is data of the job: another file was expected</source>
-        <translation>„%1“ enthält Daten des Auftrags: eine andere Datei wurde erwartet</translation>
+        <source>"%1" is the job itself: another file was expected</source>
+        <translation>„%1“ ist der Auftrag selbst: eine andere Datei wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/JobFiles.cpp"/>
@@ -2134,8 +2134,8 @@
     </message>
     <message>
         <location filename="../jobs/JobFiles.cpp"/>
-        <source>"%1" is the job itself: another file was expected</source>
-        <translation>„%1“ ist der Auftrag selbst: eine andere Datei wurde erwartet</translation>
+        <source>"%1" is data of the job: another file was expected</source>
+        <translation>„%1“ enthält Daten des Auftrags: eine andere Datei wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/JobFiles.cpp"/>
@@ -2154,8 +2154,8 @@
     </message>
     <message>
         <location filename="../jobs/JobList.cpp"/>
-        <source>the list of jobs has lines and characters 0 as well: names on lines, or each ended by a character 0, were expected</source>
-        <translation>die Liste der Aufträge hat Zeilen und auch Zeichen 0: Namen auf Zeilen, oder jeder mit einem Zeichen 0 beendet, wurden erwartet</translation>
+        <source>the list of jobs contains both line breaks and NUL characters: either one name per line or a NUL character after each name was expected</source>
+        <translation>die Auftragsliste enthält sowohl Zeilenumbrüche als auch NUL-Zeichen: erwartet wurde entweder ein Name je Zeile oder ein NUL-Zeichen nach jedem Namen</translation>
     </message>
     <message>
         <location filename="../jobs/JobOutputs.cpp"/>
@@ -2499,18 +2499,18 @@
     </message>
     <message>
         <location filename="../jobs/JsonSource.cpp"/>
-        <source>there is no place for the key "%1" in the job</source>
-        <translation>für den Schlüssel "%1" ist im Auftrag kein Platz</translation>
+        <source>the key "%1" cannot be set in the job: names of keys, and numbers of existing elements of a list, were expected between the dots</source>
+        <translation>der Schlüssel "%1" kann im Auftrag nicht gesetzt werden: zwischen den Punkten wurden Schlüsselnamen und Nummern vorhandener Listenelemente erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/LandXmlData.cpp"/>
-        <source>the file states its units: "length" alone was expected, which lengths of the job are in</source>
-        <translation>die Datei nennt ihre Einheiten: nur „length“ wurde erwartet, die Einheit der Längen im Auftrag</translation>
+        <source>a LandXML file states its own units: only "length" was expected, the unit of lengths in the job</source>
+        <translation>eine LandXML-Datei nennt ihre Einheiten selbst: nur „length“ wurde erwartet, die Einheit der Längen im Auftrag</translation>
     </message>
     <message>
         <location filename="../jobs/LandXmlQueryReader.cpp"/>
-        <source>the list "%1" has no use for the key "%2"</source>
-        <translation>die Liste „%1“ kann mit dem Schlüssel „%2“ nichts anfangen</translation>
+        <source>the list "%1" does not use the key "%2": remove the key, or choose another list</source>
+        <translation>die Liste „%1“ verwendet den Schlüssel „%2“ nicht: den Schlüssel entfernen oder eine andere Liste wählen</translation>
     </message>
     <message>
         <location filename="../jobs/LandXmlQueryReader.cpp"/>
@@ -2549,8 +2549,8 @@
     </message>
     <message>
         <location filename="../jobs/ResultOptionsReader.cpp"/>
-        <source>one ASCII character that is not a letter, a digit, a sign, a point, a quote, a blank or a line end was expected</source>
-        <translation>erwartet wurde ein ASCII-Zeichen, das kein Buchstabe, keine Ziffer, kein Vorzeichen, kein Punkt, kein Anführungszeichen, kein Leerzeichen und kein Zeilenende ist</translation>
+        <source>one ASCII character was expected, other than a letter, a digit, a sign, a point, a quote, a blank or a line end</source>
+        <translation>erwartet wurde ein ASCII-Zeichen, aber kein Buchstabe, keine Ziffer, kein Vorzeichen, kein Punkt, kein Anführungszeichen, kein Leerzeichen und kein Zeilenende</translation>
     </message>
     <message>
         <location filename="../jobs/ResultOptionsReader.cpp"/>
@@ -2628,6 +2628,11 @@
         <translation>entweder "table" oder "query" wurde erwartet</translation>
     </message>
     <message>
+        <location filename="../jobs/StandardInput.cpp"/>
+        <source>a window has no standard input: a file was expected</source>
+        <translation>ein Fenster hat keine Standardeingabe: eine Datei wurde erwartet</translation>
+    </message>
+    <message>
         <location filename="../jobs/TableShapeReader.cpp"/>
         <source>the name of a variable was expected</source>
         <translation>der Name einer Variablen wurde erwartet</translation>
@@ -2639,8 +2644,8 @@
     </message>
     <message>
         <location filename="../jobs/TableShapeReader.cpp"/>
-        <source>"beside" goes with above, below and outside alone</source>
-        <translation>"beside" gehört nur zu above, below und outside</translation>
+        <source>"beside" was expected only with above, below or outside</source>
+        <translation>"beside" wurde nur mit above, below oder outside erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/TableShapeReader.cpp"/>
@@ -2849,23 +2854,8 @@
     </message>
     <message>
         <location filename="../preview/TemplatePreview.cpp"/>
-        <source>a window has no standard input: a file was expected</source>
-        <translation>ein Fenster hat keine Standardeingabe: eine Datei wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../preview/TemplatePreview.cpp"/>
         <source>the template file cannot be written for its preview: %1</source>
         <translation>die Vorlagendatei kann für ihre Vorschau nicht geschrieben werden: %1</translation>
-    </message>
-    <message>
-        <location filename="../preview/TemplatePreview.cpp"/>
-        <source>There is not enough memory for this input.</source>
-        <translation>Der Arbeitsspeicher reicht für diese Eingabe nicht aus.</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CheckCommand.cpp"/>
-        <source>there is not enough memory for this file</source>
-        <translation>der Speicher reicht für diese Datei nicht aus</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CheckCommand.cpp"/>
@@ -3035,8 +3025,8 @@
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
-        <source>"%1": a saved report has text alone, and no values that it could be made of: render its job instead</source>
-        <translation>"%1": ein gespeicherter Bericht hat nur Text und keine Werte, aus denen das gemacht werden könnte: stattdessen den Auftrag ausführen (render)</translation>
+        <source>"%1" cannot be made from a saved report, which holds only text: use "render" with the job of the report</source>
+        <translation>"%1" kann nicht aus einem gespeicherten Bericht gemacht werden, der nur Text enthält: verwenden Sie "render" mit dem Auftrag des Berichts</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
@@ -3080,11 +3070,6 @@
     </message>
     <message>
         <location filename="../apps/kareport/JobWatch.cpp"/>
-        <source>there is not enough memory for this job</source>
-        <translation>für diesen Auftrag reicht der Speicher nicht</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobWatch.cpp"/>
         <source>standard input can be read only once: a file was expected for each data set</source>
         <translation>die Standardeingabe kann nur einmal gelesen werden: für jeden Datensatz wurde eine Datei erwartet</translation>
     </message>
@@ -3120,11 +3105,6 @@
     </message>
     <message>
         <location filename="../apps/kareport/NewCommand.cpp"/>
-        <source>there is no folder "%1"; --parents creates it</source>
-        <translation>den Ordner "%1" gibt es nicht; --parents legt ihn an</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/NewCommand.cpp"/>
         <source>Created %1 (template), %2 (data), %3 (job)</source>
         <translation>Angelegt: %1 (Vorlage), %2 (Daten), %3 (Auftrag)</translation>
     </message>
@@ -3147,6 +3127,11 @@
         <location filename="../apps/kareport/NotesFile.cpp"/>
         <source>kareport: "%1" could not be written: %2</source>
         <translation>kareport: „%1“ konnte nicht geschrieben werden: %2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/OutputFolders.cpp"/>
+        <source>there is no folder "%1"; --parents creates it</source>
+        <translation>den Ordner "%1" gibt es nicht; --parents legt ihn an</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputFolders.cpp"/>
@@ -3259,6 +3244,16 @@
         <translation>die Standardeingabe kann nur einmal gelesen werden: eine Auftragsdatei wurde erwartet</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/ChangedFile.cpp"/>
+        <source>"%1" was changed by another program, and it has unsaved changes here. Load it again and lose the changes made here?</source>
+        <translation>„%1“ wurde von einem anderen Programm geändert, und hier gibt es Änderungen, die nicht gespeichert sind. Neu laden und die hier gemachten Änderungen verwerfen?</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/ChangedFile.cpp"/>
+        <source>"%1" was changed by another program. Load it again?</source>
+        <translation>„%1“ wurde von einem anderen Programm geändert. Neu laden?</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>Open</source>
         <translation>Öffnen</translation>
@@ -3305,16 +3300,6 @@
         <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
         <source>Exported to "%1".</source>
         <translation>Exportiert nach „%1“.</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
-        <source>"%1" was changed by another program, and it has unsaved changes here. Load it again and lose the changes made here?</source>
-        <translation>„%1“ wurde von einem anderen Programm geändert, und hier gibt es Änderungen, die nicht gespeichert sind. Neu laden und die hier gemachten Änderungen verwerfen?</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
-        <source>"%1" was changed by another program. Load it again?</source>
-        <translation>„%1“ wurde von einem anderen Programm geändert. Neu laden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
@@ -3554,8 +3539,8 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobExport.cpp"/>
-        <source>"%1" already exists and is not a page of "%2": another name was expected</source>
-        <translation>"%1" ist schon vorhanden und keine Seite von "%2": ein anderer Name wurde erwartet</translation>
+        <source>"%1" already exists and is not a page of "%2": choose another name</source>
+        <translation>"%1" ist schon vorhanden und keine Seite von "%2": wählen Sie einen anderen Namen</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobExport.cpp"/>
@@ -3749,6 +3734,26 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>&amp;Units and Formats</source>
+        <translation>&amp;Einheiten und Formate</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>&amp;Page</source>
+        <translation>&amp;Seite</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>&amp;Editor</source>
+        <translation>Ed&amp;itor</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>Pro&amp;gram</source>
+        <translation>Pro&amp;gramm</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source> pt</source>
         <translation> pt</translation>
     </message>
@@ -3756,11 +3761,6 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Font size</source>
         <translation>Schriftgröße</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
-        <source>&amp;Font size of new reports:</source>
-        <translation>Schri&amp;ftgröße neuer Berichte:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
@@ -3776,6 +3776,11 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Unit of margins</source>
         <translation>Einheit der Ränder</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>&amp;Font size of new reports:</source>
+        <translation>Schri&amp;ftgröße neuer Berichte:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
@@ -3798,26 +3803,6 @@ Sollen sie wieder geöffnet werden?</translation>
         <translation>S&amp;prache (ab dem nächsten Start):</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
-        <source>&amp;Units and Formats</source>
-        <translation>&amp;Einheiten und Formate</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
-        <source>&amp;Page</source>
-        <translation>&amp;Seite</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
-        <source>&amp;Editor</source>
-        <translation>Ed&amp;itor</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
-        <source>Pro&amp;gram</source>
-        <translation>Pro&amp;gramm</translation>
-    </message>
-    <message>
         <location filename="../apps/kareport-desk/ReportExport.cpp"/>
         <source>PDF</source>
         <translation>PDF</translation>
@@ -3836,11 +3821,6 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/ReportExport.cpp"/>
         <source>it is the report's own file, which is written by Save</source>
         <translation>es ist die eigene Datei des Berichts, die mit „Speichern“ geschrieben wird</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/ReportExport.cpp"/>
-        <source>the report is empty, and a PDF has at least one page</source>
-        <translation>der Bericht ist leer, und eine PDF-Datei hat mindestens eine Seite</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
@@ -3889,21 +3869,6 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
-        <source>Choose a template file</source>
-        <translation>Vorlagendatei wählen</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
-        <source>Brow&amp;se...</source>
-        <translation>Dur&amp;chsuchen...</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
-        <source>Choose a data file</source>
-        <translation>Datendatei wählen</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Template file</source>
         <translation>Vorlagendatei</translation>
     </message>
@@ -3921,6 +3886,26 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Data file</source>
         <translation>Datendatei</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>&amp;Edit Template</source>
+        <translation>Vorlage &amp;bearbeiten</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>Choose a template file</source>
+        <translation>Vorlagendatei wählen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>Brow&amp;se...</source>
+        <translation>Dur&amp;chsuchen...</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>Choose a data file</source>
+        <translation>Datendatei wählen</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
@@ -3951,11 +3936,6 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Data (*.csv *.txt *.xml *.landxml *.gpkg *.sqlite *.db);;All files (*)</source>
         <translation>Daten (*.csv *.txt *.xml *.landxml *.gpkg *.sqlite *.db);;Alle Dateien (*)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
-        <source>&amp;Edit Template</source>
-        <translation>Vorlage &amp;bearbeiten</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialogFiles.cpp"/>
@@ -4089,6 +4069,11 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
+        <source>Angle &amp;marks:</source>
+        <translation>Winkel&amp;zeichen:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>&amp;Lengths:</source>
         <translation>&amp;Längen:</translation>
     </message>
@@ -4141,11 +4126,6 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Second mark</source>
         <translation>Sekundenzeichen</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
-        <source>Angle &amp;marks:</source>
-        <translation>Winkel&amp;zeichen:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
@@ -4751,6 +4731,11 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/run/JobWork.cpp"/>
         <source>Another job is running. Wait until it has finished, or cancel it.</source>
         <translation>Ein anderer Auftrag läuft gerade. Sein Ende abwarten oder ihn abbrechen.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/JobWork.cpp"/>
+        <source>There is not enough memory for this input.</source>
+        <translation>Der Arbeitsspeicher reicht für diese Eingabe nicht aus.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>

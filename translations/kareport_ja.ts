@@ -244,12 +244,12 @@
         <translation>%1 はそのまま印字されます</translation>
     </message>
     <message>
-        <location filename="../page/Placeholders.cpp"/>
+        <location filename="../page/PlaceholderPiece.cpp"/>
         <source>"%1" begins a placeholder that does not end: "}" was expected, or "{{" for a brace</source>
         <translation>"%1" で始まるプレースホルダーが閉じられていません: "}"、または括弧そのものを表す "{{" が必要です</translation>
     </message>
     <message>
-        <location filename="../page/Placeholders.cpp"/>
+        <location filename="../page/PlaceholderPiece.cpp"/>
         <source>unknown placeholder %1: %2</source>
         <translation>不明なプレースホルダー %1: %2</translation>
     </message>
@@ -389,14 +389,19 @@
         <translation>「%1」を保存できませんでした: %2</translation>
     </message>
     <message>
+        <location filename="../report/ReportSaveName.cpp"/>
+        <source>a part of the report was lost when memory ran out</source>
+        <translation>メモリ不足でレポートの一部が失われました</translation>
+    </message>
+    <message>
+        <location filename="../report/ReportSaveName.cpp"/>
+        <source>the report is empty, and a PDF has at least one page</source>
+        <translation>レポートが空です。PDFには少なくとも1ページ必要です</translation>
+    </message>
+    <message>
         <location filename="../report/UReportDoc.cpp"/>
         <source>Station</source>
         <translation>測点No.</translation>
-    </message>
-    <message>
-        <location filename="../report/UReportDocSave.cpp"/>
-        <source>a part of the report was lost when memory ran out</source>
-        <translation>メモリ不足でレポートの一部が失われました</translation>
     </message>
     <message>
         <location filename="../report/UReportDocText.cpp"/>
@@ -1032,11 +1037,6 @@
         <translation>別の種類のジオメトリ</translation>
     </message>
     <message>
-        <location filename="../sources/RowBatches.cpp"/>
-        <source>there is not enough memory for the data</source>
-        <translation>データを読み込むメモリが足りません</translation>
-    </message>
-    <message>
         <location filename="../sources/RowReader.cpp"/>
         <source>a row has values in several columns whose variables have one ID: that of "%1", the last one, shows</source>
         <translation>ID が同じ変数の列に複数の値がある行があります: 最後の列 "%1" の値が表示されます</translation>
@@ -1193,28 +1193,28 @@
     </message>
     <message>
         <location filename="../sources/csv/CsvRowsColumns.cpp"/>
-        <source>no column of the header row is a variable of the dictionary: a header row of variable names, with the data's delimiter between them, was expected</source>
-        <translation>見出し行に辞書の変数がありません: 変数名をデータの区切り文字で区切った見出し行が必要です</translation>
+        <source>no column of the header row is a variable of the dictionary: variable names separated by the delimiter were expected</source>
+        <translation>見出し行に辞書の変数がありません: 区切り文字で区切られた変数名が必要です</translation>
     </message>
     <message>
         <location filename="../sources/csv/CsvRowsColumns.cpp"/>
-        <source>no column is a variable of the dictionary: without a header row, columns with their numbers were expected, or an order such as PNEZD</source>
-        <translation>辞書の変数である列がありません: 見出し行がない場合は、番号付きの列、または PNEZD のような順序が必要です</translation>
+        <source>no column is a variable of the dictionary: without a header row, column numbers or an order such as PNEZD were expected</source>
+        <translation>辞書の変数である列がありません: 見出し行がない場合は、列番号、または PNEZD のような順序が必要です</translation>
     </message>
     <message>
         <location filename="../sources/csv/CsvRowsColumns.cpp"/>
-        <source>the header row holds values that fit the columns, and would be lost if it is data: "header": false (--no-header) was expected, with "skip" for lines that are not data, or "header": true</source>
-        <translation>見出し行に列に合う値があります。データであれば失われます: "header": false (--no-header)、データでない行には "skip"、または "header": true が必要です</translation>
+        <source>the header row holds values that fit the columns, and may be data. If it is data, set "header" to false (--no-header), and use "skip" for lines that are not data; otherwise set "header" to true</source>
+        <translation>見出し行に列に合う値があり、データの可能性があります。データであれば "header" を false (--no-header) にし、データでない行には "skip" を使ってください。データでなければ "header" を true にしてください</translation>
     </message>
     <message>
         <location filename="../sources/csv/CsvRowsColumns.cpp"/>
-        <source>the header row holds %1 value that fits its column, and is lost if it is data: "header" true or false was expected, which says what it is</source>
-        <translation>見出し行に列に合う値が %1 個あります。データであれば失われます: 見出しかどうかを示す "header" true または false が必要です</translation>
+        <source>the header row holds %1 value that fits its column, and may be data: set "header" to true if it is a header row, or to false if it is data</source>
+        <translation>見出し行に列に合う値が %1 個あり、データの可能性があります: 見出し行であれば "header" を true に、データであれば false にしてください</translation>
     </message>
     <message>
         <location filename="../sources/csv/CsvRowsColumns.cpp"/>
-        <source>the header row holds %1 values that fit their columns, and is lost if it is data: "header" true or false was expected, which says what it is</source>
-        <translation>見出し行に列に合う値が %1 個あります。データであれば失われます: 見出しかどうかを示す "header" の true または false が必要です</translation>
+        <source>the header row holds %1 values that fit their columns, and may be data: set "header" to true if it is a header row, or to false if it is data</source>
+        <translation>見出し行に列に合う値が %1 個あり、データの可能性があります: 見出し行であれば "header" を true に、データであれば false にしてください</translation>
     </message>
     <message>
         <location filename="../sources/csv/DelimiterGuess.cpp"/>
@@ -1243,8 +1243,8 @@
     </message>
     <message>
         <location filename="../sources/csv/DelimiterGuess.cpp"/>
-        <source>the delimiter cannot be detected: with a comma, a semicolon, a tab, a vertical bar, or blanks and tabs, the first rows do not have the same number of cells that fit their variables. The delimiter itself was expected</source>
-        <translation>区切り文字を特定できません: コンマ、セミコロン、タブ、縦棒、空白とタブのいずれでも、最初の行のセル数が一致して変数に合うことはありません。区切り文字そのものが必要です</translation>
+        <source>the delimiter cannot be determined: with a comma, a semicolon, a tab, a vertical bar, or blanks and tabs, the first rows do not have the same number of cells that fit their variables. Specify the delimiter</source>
+        <translation>区切り文字を特定できません: コンマ、セミコロン、タブ、縦棒、空白とタブのいずれでも、最初の行のセル数が一致して変数に合うことはありません。区切り文字を指定してください</translation>
     </message>
     <message>
         <location filename="../sources/csv/DelimiterGuess.cpp"/>
@@ -1253,8 +1253,8 @@
     </message>
     <message>
         <location filename="../sources/csv/DelimiterGuess.cpp"/>
-        <source>the delimiter cannot be detected: it may be %1. The delimiter itself was expected</source>
-        <translation>区切り文字を特定できません: %1 の可能性があります。区切り文字そのものが必要です</translation>
+        <source>the delimiter cannot be determined: it may be %1. Specify the delimiter</source>
+        <translation>区切り文字を特定できません: %1 の可能性があります。区切り文字を指定してください</translation>
     </message>
     <message>
         <location filename="../sources/csv/DelimiterGuess.cpp"/>
@@ -1634,8 +1634,8 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlWidths.cpp"/>
-        <source>the width is not listed: staStart, a staEnd after it, startWidth and endWidth were expected</source>
-        <translation>幅員は表示されません: staStart、それより後の staEnd、startWidth、endWidth が必要です</translation>
+        <source>the width is left out: staStart, a larger staEnd, startWidth and endWidth were expected</source>
+        <translation>幅員は省かれます: staStart、それより大きい staEnd、startWidth、endWidth が必要です</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlWidths.cpp"/>
@@ -1774,8 +1774,8 @@
     </message>
     <message>
         <location filename="../sources/landxml/XmlStreamCallbacks.h"/>
-        <source>the document type is in another file, "%1", which is not read: a file that needs no other was expected</source>
-        <translation>文書型が別のファイル「%1」にあり、これは読み込みません: 他のファイルを必要としないファイルが必要です</translation>
+        <source>the document type is in another file, "%1", which is not read: a file without an external document type was expected</source>
+        <translation>文書型が別のファイル「%1」にあり、これは読み込みません: 外部の文書型を使わないファイルが必要です</translation>
     </message>
     <message>
         <location filename="../sources/landxml/XmlStreamCallbacks.h"/>
@@ -1814,8 +1814,8 @@
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresConnection.cpp"/>
-        <source>a connection has no "%1": a password is read from the user's own password file (~/.pgpass) or from PGPASSWORD</source>
-        <translation>接続に "%1" はありません: パスワードはユーザー自身のパスワードファイル (~/.pgpass) または PGPASSWORD から読み取られます</translation>
+        <source>a connection cannot contain "%1": remove it, and put the password into your password file (~/.pgpass) or into PGPASSWORD</source>
+        <translation>接続に "%1" を含めることはできません: 削除して、パスワードはご自分のパスワードファイル (~/.pgpass) または PGPASSWORD に設定してください</translation>
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresConnection.cpp"/>
@@ -1869,8 +1869,8 @@
     </message>
     <message>
         <location filename="../sources/sqlite/SqliteFile.cpp"/>
-        <source>a database was expected, which is a file</source>
-        <translation>ファイルであるデータベースが必要です</translation>
+        <source>a database file was expected, not a folder or a device</source>
+        <translation>フォルダーやデバイスではなく、データベースファイルが必要です</translation>
     </message>
     <message>
         <location filename="../sources/sqlite/SqliteFile.cpp"/>
@@ -1894,8 +1894,8 @@
     </message>
     <message>
         <location filename="../sources/sqlite/SqliteFile.cpp"/>
-        <source>a program that wrote to the database has not ended its work: it was expected to be opened by that program first</source>
-        <translation>データベースに書き込んでいたプログラムが作業を終えていません: 先にそのプログラムで開く必要があります</translation>
+        <source>a program that wrote to the database did not finish its work: open the database with that program first</source>
+        <translation>データベースに書き込んでいたプログラムが作業を終えていません: 先にそのプログラムでデータベースを開いてください</translation>
     </message>
     <message>
         <location filename="../sources/sqlite/SqliteFile.cpp"/>
@@ -1979,8 +1979,8 @@
     </message>
     <message>
         <location filename="../jobs/ConditionBinding.cpp"/>
-        <source>the values of the variable "%1" are not numbers</source>
-        <translation>変数「%1」の値は数値ではありません</translation>
+        <source>the variable "%1" does not hold numbers: a numeric variable was expected</source>
+        <translation>変数「%1」の値は数値ではありません: 数値の変数が必要です</translation>
     </message>
     <message>
         <location filename="../jobs/ConditionBinding.cpp"/>
@@ -2019,13 +2019,13 @@
     </message>
     <message>
         <location filename="../jobs/CsvOptions.cpp"/>
-        <source>one character that is neither a digit, a letter nor a sign, and not the decimal sign, was expected</source>
-        <translation>数字、英字、符号、小数点のいずれでもない 1 文字が必要です</translation>
+        <source>one character was expected, other than a digit, a letter, a sign, a quote, a line end or the decimal sign</source>
+        <translation>数字、英字、符号、引用符、改行、小数点以外の 1 文字が必要です</translation>
     </message>
     <message>
         <location filename="../jobs/CsvOptions.cpp"/>
-        <source>one ASCII character that is not a letter, a digit, a sign, a quote or a line end, or one of %1, was expected</source>
-        <translation>英字、数字、符号、引用符、改行以外の ASCII 文字 1 つ、または %1 のいずれかが必要です</translation>
+        <source>one ASCII character was expected, other than a letter, a digit, a sign, a quote or a line end, or one of the words %1</source>
+        <translation>英字、数字、符号、引用符、改行以外の ASCII 文字 1 つ、または次のいずれかの語が必要です: %1</translation>
     </message>
     <message>
         <location filename="../jobs/CsvOptions.cpp"/>
@@ -2039,7 +2039,7 @@
     </message>
     <message>
         <location filename="../jobs/CsvOptions.cpp"/>
-        <source>one ASCII character that is not a letter, a digit, a sign, a quote or a line end was expected</source>
+        <source>one ASCII character was expected, other than a letter, a digit, a sign, a quote or a line end</source>
         <translation>英字、数字、符号、引用符、改行以外の ASCII 文字 1 つが必要です</translation>
     </message>
     <message>
@@ -2054,18 +2054,18 @@
     </message>
     <message>
         <location filename="../jobs/FormulaBinding.cpp"/>
-        <source>the variable "%1" cannot take that: one of the same measure was expected, such as a length for lengths</source>
-        <translation>変数「%1」には入れられません: 同じ種類の量の変数が必要です (長さには長さなど)</translation>
+        <source>the variable "%1" does not fit the result: a variable of the same measure was expected, such as a length for lengths</source>
+        <translation>変数「%1」は結果に合いません: 同じ種類の量の変数が必要です (長さには長さなど)</translation>
     </message>
     <message>
         <location filename="../jobs/FormulaBinding.cpp"/>
-        <source>a variable cannot be computed of itself</source>
-        <translation>変数をそれ自身から計算することはできません</translation>
+        <source>a variable cannot be computed from itself: another variable was expected</source>
+        <translation>変数をそれ自身から計算することはできません: 別の変数が必要です</translation>
     </message>
     <message>
         <location filename="../jobs/FormulaBinding.cpp"/>
-        <source>the variables do not go together: those of one measure were expected, such as lengths, or a product of two lengths or of a number</source>
-        <translation>変数の組み合わせが合いません: 同じ種類の量 (長さなど)、または二つの長さの積か数値との積が必要です</translation>
+        <source>the variables cannot be combined: variables of the same measure were expected, such as lengths, or for a product two lengths or a number and another variable</source>
+        <translation>変数を組み合わせることができません: 同じ種類の量 (長さなど) の変数、積の場合は二つの長さ、または数値と別の変数が必要です</translation>
     </message>
     <message>
         <location filename="../jobs/GroupBinding.cpp"/>
@@ -2124,8 +2124,8 @@
     </message>
     <message>
         <location filename="../jobs/JobFiles.cpp"/>
-        <source>"%1" is data of the job: another file was expected</source>
-        <translation>"%1" はジョブのデータです: 別のファイルが必要です</translation>
+        <source>"%1" is the job itself: another file was expected</source>
+        <translation>"%1" はジョブそのものです: 別のファイルが必要です</translation>
     </message>
     <message>
         <location filename="../jobs/JobFiles.cpp"/>
@@ -2134,8 +2134,8 @@
     </message>
     <message>
         <location filename="../jobs/JobFiles.cpp"/>
-        <source>"%1" is the job itself: another file was expected</source>
-        <translation>"%1" はジョブそのものです: 別のファイルが必要です</translation>
+        <source>"%1" is data of the job: another file was expected</source>
+        <translation>"%1" はジョブのデータです: 別のファイルが必要です</translation>
     </message>
     <message>
         <location filename="../jobs/JobFiles.cpp"/>
@@ -2154,8 +2154,8 @@
     </message>
     <message>
         <location filename="../jobs/JobList.cpp"/>
-        <source>the list of jobs has lines and characters 0 as well: names on lines, or each ended by a character 0, were expected</source>
-        <translation>ジョブの一覧に改行と文字コード 0 が混在しています: 名前は 1 行に 1 つ、またはそれぞれ文字コード 0 で終わる必要があります</translation>
+        <source>the list of jobs contains both line breaks and NUL characters: either one name per line or a NUL character after each name was expected</source>
+        <translation>ジョブの一覧に改行と NUL 文字が混在しています: 1 行に 1 つの名前、または各名前の後に NUL 文字が必要です</translation>
     </message>
     <message>
         <location filename="../jobs/JobOutputs.cpp"/>
@@ -2499,18 +2499,18 @@
     </message>
     <message>
         <location filename="../jobs/JsonSource.cpp"/>
-        <source>there is no place for the key "%1" in the job</source>
-        <translation>ジョブにはキー "%1" を設定できません</translation>
+        <source>the key "%1" cannot be set in the job: names of keys, and numbers of existing elements of a list, were expected between the dots</source>
+        <translation>ジョブでキー "%1" を設定できません: ピリオドの間には、キーの名前、またはリストの既存の要素の番号が必要です</translation>
     </message>
     <message>
         <location filename="../jobs/LandXmlData.cpp"/>
-        <source>the file states its units: "length" alone was expected, which lengths of the job are in</source>
-        <translation>単位はファイルが示します：ジョブの長さの単位である「length」だけが必要です</translation>
+        <source>a LandXML file states its own units: only "length" was expected, the unit of lengths in the job</source>
+        <translation>LandXML ファイルには単位が記載されています: ジョブ内の長さの単位である「length」だけが必要です</translation>
     </message>
     <message>
         <location filename="../jobs/LandXmlQueryReader.cpp"/>
-        <source>the list "%1" has no use for the key "%2"</source>
-        <translation>リスト「%1」ではキー「%2」を使いません</translation>
+        <source>the list "%1" does not use the key "%2": remove the key, or choose another list</source>
+        <translation>リスト「%1」ではキー「%2」を使いません: キーを削除するか、別のリストを選んでください</translation>
     </message>
     <message>
         <location filename="../jobs/LandXmlQueryReader.cpp"/>
@@ -2549,8 +2549,8 @@
     </message>
     <message>
         <location filename="../jobs/ResultOptionsReader.cpp"/>
-        <source>one ASCII character that is not a letter, a digit, a sign, a point, a quote, a blank or a line end was expected</source>
-        <translation>英字、数字、符号、ピリオド、引用符、空白、改行以外の ASCII 文字が 1 文字必要です</translation>
+        <source>one ASCII character was expected, other than a letter, a digit, a sign, a point, a quote, a blank or a line end</source>
+        <translation>英字、数字、符号、ピリオド、引用符、空白、改行以外の ASCII 文字 1 つが必要です</translation>
     </message>
     <message>
         <location filename="../jobs/ResultOptionsReader.cpp"/>
@@ -2628,6 +2628,11 @@
         <translation>"table" か "query" のどちらか一方が必要です</translation>
     </message>
     <message>
+        <location filename="../jobs/StandardInput.cpp"/>
+        <source>a window has no standard input: a file was expected</source>
+        <translation>ウィンドウには標準入力がありません: ファイルが必要です</translation>
+    </message>
+    <message>
         <location filename="../jobs/TableShapeReader.cpp"/>
         <source>the name of a variable was expected</source>
         <translation>変数の名前が必要です</translation>
@@ -2639,7 +2644,7 @@
     </message>
     <message>
         <location filename="../jobs/TableShapeReader.cpp"/>
-        <source>"beside" goes with above, below and outside alone</source>
+        <source>"beside" was expected only with above, below or outside</source>
         <translation>"beside" は above、below、outside とだけ使えます</translation>
     </message>
     <message>
@@ -2849,23 +2854,8 @@
     </message>
     <message>
         <location filename="../preview/TemplatePreview.cpp"/>
-        <source>a window has no standard input: a file was expected</source>
-        <translation>ウィンドウには標準入力がありません: ファイルが必要です</translation>
-    </message>
-    <message>
-        <location filename="../preview/TemplatePreview.cpp"/>
         <source>the template file cannot be written for its preview: %1</source>
         <translation>プレビューのためにテンプレートファイルを書き込めません: %1</translation>
-    </message>
-    <message>
-        <location filename="../preview/TemplatePreview.cpp"/>
-        <source>There is not enough memory for this input.</source>
-        <translation>この入力を処理するメモリが足りません。</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/CheckCommand.cpp"/>
-        <source>there is not enough memory for this file</source>
-        <translation>このファイルにはメモリが足りません</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CheckCommand.cpp"/>
@@ -3035,8 +3025,8 @@
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
-        <source>"%1": a saved report has text alone, and no values that it could be made of: render its job instead</source>
-        <translation>"%1": 保存された報告書にはテキストだけで値がないため作れません: 代わりにジョブを実行してください (render)</translation>
+        <source>"%1" cannot be made from a saved report, which holds only text: use "render" with the job of the report</source>
+        <translation>"%1" は、テキストだけを含む保存された報告書からは作れません: 報告書のジョブで "render" を使ってください</translation>
     </message>
     <message>
         <location filename="../apps/kareport/ConvertCommand.cpp"/>
@@ -3080,11 +3070,6 @@
     </message>
     <message>
         <location filename="../apps/kareport/JobWatch.cpp"/>
-        <source>there is not enough memory for this job</source>
-        <translation>このジョブにはメモリが足りません</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/JobWatch.cpp"/>
         <source>standard input can be read only once: a file was expected for each data set</source>
         <translation>標準入力は一度しか読めません: データごとにファイルが必要です</translation>
     </message>
@@ -3120,11 +3105,6 @@
     </message>
     <message>
         <location filename="../apps/kareport/NewCommand.cpp"/>
-        <source>there is no folder "%1"; --parents creates it</source>
-        <translation>フォルダー "%1" がありません。--parents で作成します</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport/NewCommand.cpp"/>
         <source>Created %1 (template), %2 (data), %3 (job)</source>
         <translation>作成しました: %1 (テンプレート)、%2 (データ)、%3 (ジョブ)</translation>
     </message>
@@ -3147,6 +3127,11 @@
         <location filename="../apps/kareport/NotesFile.cpp"/>
         <source>kareport: "%1" could not be written: %2</source>
         <translation>kareport: 「%1」を書き込めませんでした: %2</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport/OutputFolders.cpp"/>
+        <source>there is no folder "%1"; --parents creates it</source>
+        <translation>フォルダー "%1" がありません。--parents で作成します</translation>
     </message>
     <message>
         <location filename="../apps/kareport/OutputFolders.cpp"/>
@@ -3259,6 +3244,16 @@
         <translation>標準入力は一度しか読めません: ジョブファイルが必要です</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/ChangedFile.cpp"/>
+        <source>"%1" was changed by another program, and it has unsaved changes here. Load it again and lose the changes made here?</source>
+        <translation>「%1」は別のプログラムで変更されましたが、ここにも未保存の変更があります。再読み込みして、ここでの変更を破棄しますか?</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/ChangedFile.cpp"/>
+        <source>"%1" was changed by another program. Load it again?</source>
+        <translation>「%1」は別のプログラムで変更されました。再読み込みしますか?</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/DeskFrame.cpp"/>
         <source>Open</source>
         <translation>開く</translation>
@@ -3305,16 +3300,6 @@
         <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
         <source>Exported to "%1".</source>
         <translation>「%1」に書き出しました。</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
-        <source>"%1" was changed by another program, and it has unsaved changes here. Load it again and lose the changes made here?</source>
-        <translation>「%1」は別のプログラムで変更されましたが、ここにも未保存の変更があります。再読み込みして、ここでの変更を破棄しますか?</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/DeskFrameFiles.cpp"/>
-        <source>"%1" was changed by another program. Load it again?</source>
-        <translation>「%1」は別のプログラムで変更されました。再読み込みしますか?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/DeskFrameMenus.cpp"/>
@@ -3554,8 +3539,8 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobExport.cpp"/>
-        <source>"%1" already exists and is not a page of "%2": another name was expected</source>
-        <translation>「%1」はすでにあり、「%2」のページではありません。別の名前が必要です</translation>
+        <source>"%1" already exists and is not a page of "%2": choose another name</source>
+        <translation>「%1」はすでに存在し、「%2」のページではありません: 別の名前を選んでください</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/JobExport.cpp"/>
@@ -3749,6 +3734,26 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>&amp;Units and Formats</source>
+        <translation>単位と書式(&amp;U)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>&amp;Page</source>
+        <translation>ページ(&amp;P)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>&amp;Editor</source>
+        <translation>エディター(&amp;E)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>Pro&amp;gram</source>
+        <translation>プログラム(&amp;G)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source> pt</source>
         <translation> pt</translation>
     </message>
@@ -3756,11 +3761,6 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Font size</source>
         <translation>フォントサイズ</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
-        <source>&amp;Font size of new reports:</source>
-        <translation>新しい帳票のフォントサイズ(&amp;F):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
@@ -3776,6 +3776,11 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
         <source>Unit of margins</source>
         <translation>余白の単位</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
+        <source>&amp;Font size of new reports:</source>
+        <translation>新しい帳票のフォントサイズ(&amp;F):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
@@ -3798,26 +3803,6 @@ Open them again?</source>
         <translation>言語 (次回の起動から)(&amp;L):</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
-        <source>&amp;Units and Formats</source>
-        <translation>単位と書式(&amp;U)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
-        <source>&amp;Page</source>
-        <translation>ページ(&amp;P)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
-        <source>&amp;Editor</source>
-        <translation>エディター(&amp;E)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/PreferencesDialog.cpp"/>
-        <source>Pro&amp;gram</source>
-        <translation>プログラム(&amp;G)</translation>
-    </message>
-    <message>
         <location filename="../apps/kareport-desk/ReportExport.cpp"/>
         <source>PDF</source>
         <translation>PDF</translation>
@@ -3836,11 +3821,6 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/ReportExport.cpp"/>
         <source>it is the report's own file, which is written by Save</source>
         <translation>この帳票自身のファイルです。「保存」で書き込みます</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/ReportExport.cpp"/>
-        <source>the report is empty, and a PDF has at least one page</source>
-        <translation>レポートが空です。PDFには少なくとも1ページ必要です</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/SaveAs.cpp"/>
@@ -3889,21 +3869,6 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
-        <source>Choose a template file</source>
-        <translation>テンプレートファイルの選択</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
-        <source>Brow&amp;se...</source>
-        <translation>参照(&amp;S)...</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
-        <source>Choose a data file</source>
-        <translation>データファイルの選択</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Template file</source>
         <translation>テンプレートファイル</translation>
     </message>
@@ -3921,6 +3886,26 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Data file</source>
         <translation>データファイル</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>&amp;Edit Template</source>
+        <translation>テンプレートを編集(&amp;E)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>Choose a template file</source>
+        <translation>テンプレートファイルの選択</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>Brow&amp;se...</source>
+        <translation>参照(&amp;S)...</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>Choose a data file</source>
+        <translation>データファイルの選択</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
@@ -3951,11 +3936,6 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Data (*.csv *.txt *.xml *.landxml *.gpkg *.sqlite *.db);;All files (*)</source>
         <translation>データ (*.csv *.txt *.xml *.landxml *.gpkg *.sqlite *.db);;すべてのファイル (*)</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
-        <source>&amp;Edit Template</source>
-        <translation>テンプレートを編集(&amp;E)</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialogFiles.cpp"/>
@@ -4089,6 +4069,11 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
+        <source>Angle &amp;marks:</source>
+        <translation>角度の記号(&amp;M):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>&amp;Lengths:</source>
         <translation>長さ(&amp;L):</translation>
     </message>
@@ -4141,11 +4126,6 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
         <source>Second mark</source>
         <translation>秒の記号</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
-        <source>Angle &amp;marks:</source>
-        <translation>角度の記号(&amp;M):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/UnitsPage.cpp"/>
@@ -4751,6 +4731,11 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/run/JobWork.cpp"/>
         <source>Another job is running. Wait until it has finished, or cancel it.</source>
         <translation>別のジョブが実行中です。終了を待つか、中止してください。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/run/JobWork.cpp"/>
+        <source>There is not enough memory for this input.</source>
+        <translation>この入力を処理するメモリが足りません。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/run/NotesPane.cpp"/>

@@ -50,7 +50,7 @@ CLI::App *addTemplates(CLI::App &program, TemplatesWords &words, ArgumentKinds &
 CLI::App *addCheck(CLI::App &program, CheckWords &words, ArgumentKinds &kinds)
 {
     CLI::App *check = program.add_subcommand(
-        "check", "Report what in template files is not read as it looks, and how the data of jobs fits its template");
+        "check", "Find mistakes in template files, and say how the data of jobs fits its template");
     kinds
         .note(ArgumentKind::CheckedFile,
               check->add_option("FILE", words.files,

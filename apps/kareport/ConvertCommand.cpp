@@ -89,7 +89,7 @@ std::optional<QString> ConvertCommand::usageError() const
     const OutputKind kind = *outputKindOf(output, outputKindFromName(as));
     if (isMadeOfResults(kind)) {
         return Xlate(
-                   "\"%1\": a saved report has text alone, and no values that it could be made of: render its job instead")
+                   "\"%1\" cannot be made from a saved report, which holds only text: use \"render\" with the job of the report")
             .arg(output);
     }
     return std::nullopt;

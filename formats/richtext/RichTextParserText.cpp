@@ -71,8 +71,8 @@ void RichTextParser::putAscii(std::string_view bytes)
     }
 }
 
-/// Puts the signs that bytes below 0x80 are the numbers of. Of a font that is not known they stay what they are: many a font
-/// of letters says to hold signs.
+/// Appends the symbols of a symbol font whose codes are the bytes below 0x80. In a font that is not known the bytes stay
+/// letters: many fonts of letters claim to be symbol fonts.
 void RichTextParser::putSigns(std::string_view bytes)
 {
     for (const char byte : bytes) {
@@ -215,7 +215,7 @@ void RichTextParser::readUnicode(int number)
 {
     fallback_ = state_.fallbackCount;
     if (number < 0) {
-        // Numbers are signed in the way of 16 bits.
+        // Numbers are written as signed 16-bit integers.
         number = number >= -0x8000 ? number + 0x10000 : int(QChar::ReplacementCharacter);
     }
     if (number > int(QChar::LastValidCodePoint)) {

@@ -108,13 +108,16 @@ bool CsvRows::bindColumns(const CsvDialect &dialect, const Variables &variables)
 
 void CsvRows::failWithoutVariable()
 {
-    error_ = isNamed_
-                 ? reader_.errorAt(reader_.placeOfCell(0),
-                                   Xlate("no column of the header row is a variable of the dictionary: a header row of "
-                                         "variable names, with the data's delimiter between them, was expected"))
-                 : InputError{file_->path(), std::nullopt,
-                              Xlate("no column is a variable of the dictionary: without a header row, columns with "
-                                    "their numbers were expected, or an order such as PNEZD")};
+    error_ =
+        isNamed_
+            ? reader_.errorAt(
+                  reader_.placeOfCell(0),
+                  Xlate(
+                      "no column of the header row is a variable of the dictionary: variable names separated by the delimiter were expected"))
+            : InputError{
+                  file_->path(), std::nullopt,
+                  Xlate(
+                      "no column is a variable of the dictionary: without a header row, column numbers or an order such as PNEZD were expected")};
 }
 
 /// Looks whether the row that was read last has values of the variables instead of their names. Half of those cells at least
@@ -153,17 +156,15 @@ void CsvRows::lookAtHeader(const CsvDialect &dialect)
         headerIsData_ = reader_.errorAt(
             reader_.placeOfCell(0),
             Xlate(
-                "the header row holds values that fit the columns, and would be lost if it is data: \"header\": false "
-                "(--no-header) was expected, with \"skip\" for lines that are not data, or \"header\": true"));
+                "the header row holds values that fit the columns, and may be data. If it is data, set \"header\" to false (--no-header), and use \"skip\" for lines that are not data; otherwise set \"header\" to true"));
         return;
     }
     const QString sentence =
         values.size() == 1
-            ? Xlate("the header row holds %1 value that fits its column, and is lost if it is data: \"header\" true or "
-                    "false was expected, which says what it is")
+            ? Xlate(
+                  "the header row holds %1 value that fits its column, and may be data: set \"header\" to true if it is a header row, or to false if it is data")
             : Xlate(
-                  "the header row holds %1 values that fit their columns, and is lost if it is data: \"header\" true or "
-                  "false was expected, which says what it is");
+                  "the header row holds %1 values that fit their columns, and may be data: set \"header\" to true if it is a header row, or to false if it is data");
     notes_.push_back(reader_.errorAt(reader_.placeOfCell(values.front()), sentence.arg(values.size())));
 }
 

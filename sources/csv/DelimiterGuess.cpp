@@ -129,9 +129,8 @@ const CsvDialect *clearlyWrong(const std::vector<Failure> &failures)
 
 InputError noneIsPossible(const QString &path, const std::vector<Failure> &failures)
 {
-    QString text = Xlate("the delimiter cannot be detected: with a comma, a semicolon, a tab, a vertical bar, or "
-                         "blanks and tabs, the first rows do not have the same number of cells that fit their "
-                         "variables. The delimiter itself was expected");
+    QString text = Xlate(
+        "the delimiter cannot be determined: with a comma, a semicolon, a tab, a vertical bar, or blanks and tabs, the first rows do not have the same number of cells that fit their variables. Specify the delimiter");
     for (const Failure &failure : failures) {
         if (failure.hasColumns) {
             const auto &place = failure.error.place;
@@ -159,7 +158,7 @@ Expected<CsvDialect> only(const QString &path, const std::vector<Reading> &possi
         names.append(nameOf(reading.dialect));
     }
     return InputError{path, std::nullopt,
-                      Xlate("the delimiter cannot be detected: it may be %1. The delimiter itself was expected")
+                      Xlate("the delimiter cannot be determined: it may be %1. Specify the delimiter")
                           .arg(names.join(Xlate(" or @@between two delimiters")))};
 }
 

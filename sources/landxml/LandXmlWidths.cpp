@@ -43,8 +43,8 @@ bool LandXmlWidths::add(const LandXmlZone &stored, LandXmlNotes &notes)
         const bool isNone =
             std::isnan(piece.atStart) && std::isnan(piece.atEnd); // the file does not say how wide it is
         if (!isWhole(piece) && !isNone && !piece.isUnreadable) {
-            notes.add(piece.byte, Xlate("the width is not listed: staStart, a staEnd after it, startWidth and endWidth "
-                                        "were expected"));
+            notes.add(piece.byte,
+                      Xlate("the width is left out: staStart, a larger staEnd, startWidth and endWidth were expected"));
         }
         return !isWhole(piece);
     });

@@ -54,10 +54,11 @@ struct XmlStream::Callbacks
     {
         if (file != nullptr) {
             guarded(data, [&](XmlStream &stream) {
-                stream.fail(stream.currentByte(),
-                            Xlate("the document type is in another file, \"%1\", which is not read: "
-                                  "a file that needs no other was expected")
-                                .arg(shortName(file)));
+                stream.fail(
+                    stream.currentByte(),
+                    Xlate(
+                        "the document type is in another file, \"%1\", which is not read: a file without an external document type was expected")
+                        .arg(shortName(file)));
             });
         }
     }

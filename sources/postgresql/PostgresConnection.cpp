@@ -59,11 +59,11 @@ bool PostgresConnection::check(const QString &connection)
         const QByteArray keyword = option->keyword;
         const bool isSecret = keyword == "password" || keyword == "sslpassword" || keyword == "passfile";
         if (isSecret && option->val != nullptr) {
-            error_ =
-                InputError{name_, std::nullopt,
-                           Xlate("a connection has no \"%1\": a password is read from the user's own password file "
-                                 "(~/.pgpass) or from PGPASSWORD")
-                               .arg(QString::fromUtf8(keyword))};
+            error_ = InputError{
+                name_, std::nullopt,
+                Xlate(
+                    "a connection cannot contain \"%1\": remove it, and put the password into your password file (~/.pgpass) or into PGPASSWORD")
+                    .arg(QString::fromUtf8(keyword))};
             return false;
         }
     }

@@ -88,7 +88,7 @@ SqliteFile::SqliteFile(const QString &path) : path_(path)
 {
     const QFileInfo info(path);
     if (info.exists() && !info.isFile()) {
-        error_ = InputError{path_, std::nullopt, Xlate("a database was expected, which is a file")};
+        error_ = InputError{path_, std::nullopt, Xlate("a database file was expected, not a folder or a device")};
         return;
     }
     // A complete path is never taken for an address with options in it.
@@ -101,7 +101,7 @@ SqliteFile::SqliteFile(const QString &path) : path_(path)
     }
     configure();
     if (begin()) {
-        // Not before the lock is had: what another program wrote until then is not a change during the reading.
+        // Not before: another program may have written while the lock was waited for, and that is not a change.
         const QFileInfo locked(path);
         size_ = locked.size();
         modified_ = locked.lastModified();
@@ -215,8 +215,7 @@ QString SqliteFile::reasonOf(int code) const
     case SQLITE_CORRUPT: return Xlate("the database is broken: %1").arg(text);
     case SQLITE_READONLY:
         return Xlate(
-            "a program that wrote to the database has not ended its work: it was expected to be opened by that "
-            "program first");
+            "a program that wrote to the database did not finish its work: open the database with that program first");
     case SQLITE_CANTOPEN: {
         const int reason = sqlite3_system_errno(database_);
         return Xlate("the database cannot be opened: %1")

@@ -153,7 +153,7 @@ TEST(GroupJob, RunsOverRows)
     TestJob test;
     const QString text = run(test, R"("table": "Sorted", "data": "v", "groups": [{"by": "Layer"}],
         "running": [{"variable": "Area", "sum": "Length", "per": "group"}])");
-    EXPECT_TRUE(text.contains(u"cannot take that")) << "a sum of lengths is not an area: " << text.toStdString();
+    EXPECT_TRUE(text.contains(u"does not fit the result")) << "a sum of lengths is no area: " << text.toStdString();
     const QByteArray data = R"("v": {"values": [{"Number": "1", "Length": 0.1}, {"Number": "2", "Length": 0.2},
         {"Number": "2", "Length": 0.4}]})";
     const QString shown = run(test, R"("table": "Wide", "data": "v", "sort": "Number", "groups": [{"by": "Number"}],

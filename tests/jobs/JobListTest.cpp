@@ -142,7 +142,7 @@ TEST(JobList, ACharacter0InALineIsAnError)
         const auto *error = kareport::errorOf(jobs);
         ASSERT_NE(error, nullptr) << "a name that would be parted";
         EXPECT_EQ(placeText(error->place), QStringLiteral("2:2"));
-        EXPECT_TRUE(error->text.contains(u"lines and characters 0 as well")) << error->text.toStdString();
+        EXPECT_TRUE(error->text.contains(u"both line breaks and NUL characters")) << error->text.toStdString();
     }
 }
 

@@ -209,13 +209,15 @@ TEST(JobReaderError, OfData)
     expectErrors(rows);
 }
 
-TEST(JobReaderError, OfTheKindsOfData)
+TEST(JobReaderError, OfTheMarksOfTextFiles)
 {
     constexpr Row rows[] = {
         {R"({"report": [], "data": {"p": {"csv": "p", "delimiter": @"tab"}}})", "whitespace, auto", "no such word"},
-        {R"({"report": [], "data": {"p": {"csv": "p", "delimiter": @"5"}}})", "not a letter, a digit", "a digit"},
-        {R"({"report": [], "data": {"p": {"csv": "p", "delimiter": @"x"}}})", "not a letter, a digit", "a letter"},
-        {R"({"report": [], "data": {"p": {"csv": "p", "delimiter": @"-"}}})", "not a letter, a digit", "a sign"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "delimiter": @"5"}}})", "other than a letter, a digit",
+         "a digit"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "delimiter": @"x"}}})", "other than a letter, a digit",
+         "a letter"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "delimiter": @"-"}}})", "other than a letter, a digit", "a sign"},
         {R"({"report": [], "data": {"p": {"csv": "p", "delimiter": @"."}}})", "that of \"decimal\"",
          "the decimal point, which the job does not say"},
         {R"({"report": [], "data": {"p": {"csv": "p", "decimal": @","}}})", "that of \"delimiter\"",
@@ -223,10 +225,24 @@ TEST(JobReaderError, OfTheKindsOfData)
         {R"({"report": [], "data": {"p": {"csv": "p", "thousands": @","}}})", "that of \"delimiter\"", "the same"},
         {R"({"report": [], "data": {"p": {"csv": "p", "comment": @","}}})", "that of \"delimiter\"", "empty cells"},
         {R"({"report": [], "data": {"p": {"csv": "p", "comment": @"."}}})", "that of \"decimal\"", "such as .5"},
-        {R"({"report": [], "data": {"p": {"csv": "p", "comment": @"-"}}})", "not a letter, a digit", "such as -5"},
-        {R"({"report": [], "data": {"p": {"csv": "p", "comment": @"1"}}})", "not a letter, a digit", "such as 12"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "comment": @"-"}}})", "other than a letter, a digit",
+         "such as -5"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "comment": @"1"}}})", "other than a letter, a digit",
+         "such as 12"},
         {R"({"report": [], "data": {"p": {"csv": "p", "delimiter": "whitespace", "comment": @" "}}})",
          "that of \"delimiter\"", "blanks around a row"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "decimal": @";"}}})", "\".\", \",\"", "no decimal sign"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "thousands": @"."}}})", "or the decimal sign", "is one"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "thousands": @"5"}}})", "other than a digit", "is a digit"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "thousands": @""}}})", "one character", "none"},
+        {R"({"report": [], "data": {"p": {"csv": "p", "comment": @"//"}}})", "one ASCII character", "two"},
+    };
+    expectErrors(rows);
+}
+
+TEST(JobReaderError, OfTheRowsOfTextFiles)
+{
+    constexpr Row rows[] = {
         {R"({"report": [], "data": {"p": {"csv": "p", "header": @"no"}}})", "true or false", "wrong type"},
         {R"({"report": [], "data": {"p": {"csv": "p", "columns": @[]}}})", "in their order", "no column"},
         {R"({"report": [], "data": {"p": {"csv": "p", "columns": ["A", @5]}}})", "a text", "a number for a name"},
@@ -238,17 +254,19 @@ TEST(JobReaderError, OfTheKindsOfData)
         {R"({"report": [], "data": {"p": {"csv": "p", "order": @""}}})", "PNEZD", "no letter"},
         {R"({"report": [], "data": {"p": {"csv": "p", "columns": ["A"], "order": @"P"}}})", "either", "named twice"},
         {R"({"report": [], "data": {"p": {"csv": "p", "encoding": @"UTF-8"}}})", "utf-8, latin-1", "case matters"},
-        {R"({"report": [], "data": {"p": {"csv": "p", "decimal": @";"}}})", "\".\", \",\"", "no decimal sign"},
-        {R"({"report": [], "data": {"p": {"csv": "p", "thousands": @"."}}})", "not the decimal sign", "is one"},
-        {R"({"report": [], "data": {"p": {"csv": "p", "thousands": @"5"}}})", "neither a digit", "is a digit"},
-        {R"({"report": [], "data": {"p": {"csv": "p", "thousands": @""}}})", "one character", "none"},
         {R"({"report": [], "data": {"p": {"csv": "p", "skip": @-1}}})", "a whole number from 0", "below 0"},
-        {R"({"report": [], "data": {"p": {"csv": "p", "comment": @"//"}}})", "one ASCII character", "two"},
         {R"({"report": [], "data": {"p": {"csv": "p", "skipBlankLines": @1}}})", "true or false", "wrong type"},
         {R"({"report": [], "data": {"p": {"csv": "p", @"encodign": "utf-8"}}})", "did you mean \"encoding\"?",
          "misspelt"},
         {R"({"report": [], "data": {"p": {"csv": "p", @"query": "SELECT 1"}}})", "unknown key \"query\"",
          "a key of another kind"},
+    };
+    expectErrors(rows);
+}
+
+TEST(JobReaderError, OfTheOtherKindsOfData)
+{
+    constexpr Row rows[] = {
         {R"({"report": [], "data": {"p": @{"sqlite": "p"}}})", "either \"table\" or \"query\"", "neither"},
         {R"({"report": [], "data": {"p": @{"sqlite": "p", "table": "a", "query": "b"}}})", "either \"table\"", "both"},
         {R"({"report": [], "data": {"p": {"sqlite": "p", "table": @5}}})", "a text", "wrong type"},

@@ -153,7 +153,7 @@ TEST(LandXmlData, MistakesHaveTheirPlace)
         {R"("landxml": "road.xml", "list": "points", "group": "h")", "road.xml", "one of g was expected", "no group"},
         {R"("landxml": "road.xml", "list": "points", "delimiter": ";")", "job.json", "\"delimiter\"",
          "a key of another kind"},
-        {R"("landxml": "road.xml", "list": "points", "units": {"angle": "gon"})", "job.json", "\"length\" alone",
+        {R"("landxml": "road.xml", "list": "points", "units": {"angle": "gon"})", "job.json", "only \"length\"",
          "a unit that the file says"},
         {R"("landxml": "road.xml", "list": "parcels")", "road.xml", "the dictionary has none of the variables",
          "a list of another dictionary"},

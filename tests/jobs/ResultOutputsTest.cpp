@@ -28,27 +28,6 @@ TEST(ResultOutputs, RowsAreWrittenInTheUnitsOfTheData)
                                     "{\"Number\":\"2A\",\"Northing\":null}\n");
 }
 
-TEST(ResultOutputs, TheTextIsKeptWhereAnOutputHasIt)
-{
-    struct Row
-    {
-        const char *outputs;
-        bool hasText;
-        const char *reason;
-    };
-    constexpr Row rows[] = {
-        {R"("p.csv", "p.jsonl")", false, "values alone"},
-        {R"("p.csv", "p.txt")", true, "a text as well"},
-    };
-    for (const Row &row : rows) {
-        ResultJob job;
-        job.discardsText = true;
-        job.run(withOutputs(templateJob(twoPoints, oneTable), row.outputs));
-        EXPECT_EQ(job.bytes("p.csv"), "Number,Northing\n\"1, \"\"a\"\"\",12.5\n2A,\n") << row.reason;
-        EXPECT_EQ(!job.text.isEmpty(), row.hasText) << row.reason;
-    }
-}
-
 TEST(ResultOutputs, RowsAreWrittenAsPrinted)
 {
     ResultJob job;

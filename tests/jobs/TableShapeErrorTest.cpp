@@ -27,14 +27,39 @@ QByteArray pointsWithLengths()
                                          element("Options", separatorOption("124")));
 }
 
-TEST(TableShapeError, HasItsPlaceAndSaysWhatWasExpected)
+/// A step with one mistake.
+struct Row
 {
-    const struct
-    {
-        const char *keys;
-        const char *about; ///< the text at the place of the error
-        const char *error;
-    } rows[] = {
+    const char *keys;
+    const char *about; ///< the text at the place of the error
+    const char *error;
+};
+
+template <std::size_t count>
+void expectErrors(const Row (&rows)[count])
+{
+    for (const Row &row : rows) {
+        TestJob test;
+        test.folder.put("t.xml", pointsWithLengths());
+        const QByteArray before = R"({"table": "Points", "data": "p", )";
+        const QByteArray content =
+            jobs::templateJob(R"("p": {"values": [{"Number": "1", "Northing": 12.5}]})", before + row.keys + '}');
+        test.run(content);
+        ASSERT_TRUE(test.error) << row.keys;
+        EXPECT_EQ(test.error->text.toStdString(), row.error) << row.keys;
+        const QByteArray whole = jobs::fixedFront + content + '}';
+        const qsizetype step = whole.indexOf(before) + before.size();
+        const qsizetype about = whole.indexOf(row.about, step);
+        ASSERT_GE(about, 0) << row.about;
+        ASSERT_TRUE(test.error->place) << row.keys;
+        EXPECT_EQ(whole.lastIndexOf('\n', about), -1);
+        EXPECT_EQ(test.error->place->column, about + 1) << row.keys;
+    }
+}
+
+TEST(TableShapeError, OfGroups)
+{
+    constexpr Row rows[] = {
         {R"("group": [])", R"("group")",
          "unknown key \"group\": table, data, before, after, headingAfter, sort, where, "
          "compute, running, flags, groups, totals, pageTotals, rounding expected; did you mean \"groups\"?"},
@@ -60,6 +85,13 @@ TEST(TableShapeError, HasItsPlaceAndSaysWhatWasExpected)
          "\"{Note\" begins a placeholder that does not end: \"}\" was expected, or \"{{\" for a brace"},
         {R"("sort": "Note", "groups": [{"by": "Note", "heading": "{sum:Note}"}])", R"("{sum:Note}")",
          "values of the variable \"Note\" cannot be added up: a number, a length, an area or an angle was expected, or \"count\""},
+    };
+    expectErrors(rows);
+}
+
+TEST(TableShapeError, OfTotals)
+{
+    constexpr Row rows[] = {
         {R"("totals": [{"sum": "Note"}])", R"("Note")",
          "values of the variable \"Note\" cannot be added up: a number, a length, an area or an angle was expected, or \"count\""},
         {R"("totals": [{"mean": "Bearing"}])", R"("Bearing")",
@@ -73,6 +105,13 @@ TEST(TableShapeError, HasItsPlaceAndSaysWhatWasExpected)
         {R"("totals": [{"label": "{Number}"}])", R"("{Number}")",
          "unknown placeholder {Number}: one of {count}, {sum:...}, {mean:...}, {min:...}, {max:...}, {count:...}, {lengthUnit}, {areaUnit}, {angleUnit} was expected"},
         {R"("rounding": "up", "totals": [])", R"("up")", "one of exact, printed was expected"},
+    };
+    expectErrors(rows);
+}
+
+TEST(TableShapeError, OfConditions)
+{
+    constexpr Row rows[] = {
         {R"("where": [{"of": "Northing"}])", R"({"of")",
          "one of is, isNot, above, below, outside, exists was expected"},
         {R"("where": [{"of": "Northing", "above": 1, "below": 2}])", "2",
@@ -80,34 +119,50 @@ TEST(TableShapeError, HasItsPlaceAndSaysWhatWasExpected)
         {R"("where": [{"of": "Northing", "above": "high"}])", R"("high")",
          "a number was expected, as the variable \"Northing\" has it"},
         {R"("where": [{"of": "Note", "above": 1}])", R"("Note")",
-         "the values of the variable \"Note\" are not numbers"},
+         "the variable \"Note\" does not hold numbers: a numeric variable was expected"},
         {R"("where": [{"of": "Northing", "outside": -1}])", "-1", "a tolerance of 0 or more was expected"},
         {R"("where": [{"of": "Northing", "above": 1, "beside": "Area"}])", R"("Area")",
          "\"Northing\" and \"Area\" cannot be compared: they have different units"},
         {R"("where": [{"of": "Note", "is": "x", "beside": "Note"}])", R"("Note"}])",
-         "\"beside\" goes with above, below and outside alone"},
+         "\"beside\" was expected only with above, below or outside"},
+        {R"("where": [{"of": "Northing", "above": "NAN"}])", R"("NAN")",
+         "a number was expected: nothing is above or below NAN"},
+    };
+    expectErrors(rows);
+}
+
+TEST(TableShapeError, OfWhatIsComputed)
+{
+    constexpr Row rows[] = {
         {R"("compute": [{"variable": "Area", "sum": ["Northing", "Easting"]}])", R"("Area")",
-         "the variable \"Area\" cannot take that: one of the same measure was expected, such as a length for lengths"},
+         "the variable \"Area\" does not fit the result: a variable of the same measure was expected, such as a length for lengths"},
         {R"("compute": [{"variable": "Area", "sum": ["Northing", "Area"]}])", R"("Area"]}])",
-         "a variable cannot be computed of itself"},
+         "a variable cannot be computed from itself: another variable was expected"},
         {R"("compute": [{"variable": "Northing", "sum": ["Easting", "Area"]}])", R"({"variable")",
-         "the variables do not go together: those of one measure were expected, such as lengths, or a product of two lengths or of a number"},
+         "the variables cannot be combined: variables of the same measure were expected, such as lengths, or for a product two lengths or a number and another variable"},
         {R"("compute": [{"variable": "Northing", "difference": ["Easting"]}])", "[\"Easting\"",
          "two variables were expected"},
         {R"("compute": [{"variable": "Northing", "sum": ["Note", "Easting"]}])", R"("Note")",
-         "the values of the variable \"Note\" are not numbers"},
+         "the variable \"Note\" does not hold numbers: a numeric variable was expected"},
         {R"("running": [{"variable": "Easting", "sum": "Northing", "per": "page"}])", R"("page")",
          "one of table, group was expected"},
         {R"("running": [{"variable": "Easting", "sum": "Northing", "per": "group"}])", R"({"variable")",
          "\"per\": \"group\" goes with groups: the key \"groups\" was expected in the step"},
         {R"("running": [{"variable": "Area", "rowNumber": true}])", R"("Area")",
-         "the variable \"Area\" cannot take that: one of the same measure was expected, such as a length for lengths"},
+         "the variable \"Area\" does not fit the result: a variable of the same measure was expected, such as a length for lengths"},
         {R"("flags": [{"variable": "Area", "text": "!", "of": "Northing", "above": 1}])", R"("Area")",
          "a flag needs a text, or a mark: the variable \"Area\" is neither"},
         {R"("flags": [{"variable": "Note", "of": "Northing", "above": 1}])", R"({"variable")",
          "the key \"text\" with the text of the flag was expected"},
         {R"("flags": [{"variable": "Mark", "text": "!", "of": "Northing", "above": 1}])", R"("!")",
          "the variable \"Mark\" has a mark and no text"},
+    };
+    expectErrors(rows);
+}
+
+TEST(TableShapeError, OfTheOrderInWhichValuesAreSet)
+{
+    constexpr Row rows[] = {
         {R"("compute": [{"variable": "Area", "product": ["Northing", "Easting"]}], "running": [{"variable": "Easting", "sum": "Northing"}])",
          R"("Easting"]}])",
          "the step sets \"Easting\" only after this: a variable of the data, or one that is set before, was expected"},
@@ -120,28 +175,10 @@ TEST(TableShapeError, HasItsPlaceAndSaysWhatWasExpected)
         {R"("flags": [{"variable": "Note", "text": "!", "of": "Northing", "beside": "Easting", "above": 1}], "compute": [{"variable": "Area", "product": ["Easting", "Northing"]}], "running": [{"variable": "Northing", "difference": "Easting"}])",
          R"("Northing"]}])",
          "the step sets \"Northing\" only after this: a variable of the data, or one that is set before, was expected"},
-        {R"("where": [{"of": "Northing", "above": "NAN"}])", R"("NAN")",
-         "a number was expected: nothing is above or below NAN"},
         {R"("compute": [{"variable": "Easting", "sum": ["Northing", "Northing"]}], "sort": "Easting")", R"("Easting"})",
          "rows are sorted before \"Easting\" is computed: a variable of the data was expected"},
     };
-    for (const auto &row : rows) {
-        TestJob test;
-        test.folder.put("t.xml", pointsWithLengths());
-        const QByteArray before = R"({"table": "Points", "data": "p", )";
-        const QByteArray content =
-            jobs::templateJob(R"("p": {"values": [{"Number": "1", "Northing": 12.5}]})", before + row.keys + '}');
-        test.run(content);
-        ASSERT_TRUE(test.error) << row.keys;
-        EXPECT_EQ(test.error->text.toStdString(), row.error) << row.keys;
-        const QByteArray whole = jobs::fixedFront + content + '}';
-        const qsizetype step = whole.indexOf(before) + before.size();
-        const qsizetype about = whole.indexOf(row.about, step);
-        ASSERT_GE(about, 0) << row.about;
-        ASSERT_TRUE(test.error->place) << row.keys;
-        EXPECT_EQ(whole.lastIndexOf('\n', about), -1);
-        EXPECT_EQ(test.error->place->column, about + 1) << row.keys;
-    }
+    expectErrors(rows);
 }
 
 TEST(TableShapeError, ATableThatTheTemplateSortsIsNotSortedAgain)

@@ -132,7 +132,7 @@ TEST(CommandLineResults, ASavedReportHasNoValues)
     ASSERT_EQ(folder.run("render job.json -o a.rep").status, 0);
     const ProgramRun run = folder.run("convert a.rep a.csv");
     EXPECT_EQ(run.status, 1) << run.all().constData();
-    EXPECT_THAT(run.err.toStdString(), HasSubstr("a saved report has text alone"));
+    EXPECT_THAT(run.err.toStdString(), HasSubstr("cannot be made from a saved report"));
 }
 
 } // namespace

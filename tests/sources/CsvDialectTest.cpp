@@ -152,6 +152,10 @@ TEST(CsvDialect, AnOrderNamesTheColumns)
          {"error there is no column 3: one of 1 to 2 was expected"},
          "a column that does not exist"},
     });
+}
+
+TEST(CsvDialect, AHeaderRowBesideAnOrderIsSkippedUnlessItMayBeData)
+{
     CsvDialect withHeader = ordered("PN");
     withHeader.hasHeader = true;
     check({{withHeader, "Northing,Number\n1,2\n", {"number=1 northing=2"}, "a header row is skipped"},
@@ -232,6 +236,13 @@ TEST(CsvDialect, ColumnsAreChosen)
          {"error there is no column \"P\""},
          "a name where there are none"},
         {chosen({}, false), "1,2,3\n", {"error no column is a variable"}, "nothing says what the columns are"},
+    });
+}
+
+TEST(CsvDialect, ColumnsThatCannotBeChosenAreSaid)
+{
+    const QStringList point = {"number=1 elevation=3"};
+    check({
         {chosen({{"Elevation", 0}}), "Number,Y,Z\n1,2,3\n", {"error 1:1 there is no column 0"}, "numbers begin with 1"},
         {chosen({{"Elevation", QStringLiteral("Elv")}}),
          "Number,Elev\n1,2\n",

@@ -55,7 +55,7 @@ TEST(CsvHeader, OfNumbersIsOneWhereTheJobReadsItSo)
     const std::vector<ColumnChoice> numbers = {{QStringLiteral("Number"), 1}, {QStringLiteral("Elevation"), 2}};
     const Read unsure = read("Pt,2020\n1,2\n", chosen(numbers));
     EXPECT_TRUE(unsure.rows.value(0).startsWith(u"error 1:1 the header row holds values")) << "it may be a point";
-    EXPECT_TRUE(unsure.rows.value(0).endsWith(u"or \"header\": true")) << "what helps is said";
+    EXPECT_TRUE(unsure.rows.value(0).endsWith(u"otherwise set \"header\" to true")) << "what helps is said";
     const Read said = read("Pt,2020\n1,2\n", chosen(numbers, true));
     EXPECT_EQ(said.rows, QStringList(QStringLiteral("number=1 elevation=2")));
     EXPECT_EQ(said.notes, QStringList());

@@ -57,9 +57,8 @@ TEST(LandXmlWidths, ThatAreWrongAreNoError)
     EXPECT_FALSE(file.list->error());
     ASSERT_EQ(file.notes().size(), 3);
     EXPECT_TRUE(file.notes()[0].startsWith(u"6:") && file.notes()[0].contains(u"staEnd=\"x\""));
-    EXPECT_TRUE(
-        file.notes()[1].endsWith(u": the width is not listed: staStart, a staEnd after it, startWidth and endWidth "
-                                 u"were expected"))
+    EXPECT_TRUE(file.notes()[1].endsWith(u": the width is left out: staStart, a larger staEnd, startWidth and endWidth "
+                                         u"were expected"))
         << file.notes()[1].toStdString();
     EXPECT_EQ(file.notes()[2], u"7:13: the widths belong to the alignment \"gone\", which is not in the file"_qs);
 }
@@ -70,7 +69,7 @@ TEST(LandXmlWidths, WithoutAnEndAreNotedAndNotListed)
                           "\n<Zone staStart='1000' staEnd='1100' category='Verge'/></Zones>"),
                      queryOf(Kind::Stations), {QStringLiteral("LeftWidth")});
     EXPECT_EQ(file.rows(), QStringList({u"-"_qs, u"-"_qs}));
-    EXPECT_EQ(file.notes(), QStringList(u"7:1: the width is not listed: staStart, a staEnd after it, startWidth and "
+    EXPECT_EQ(file.notes(), QStringList(u"7:1: the width is left out: staStart, a larger staEnd, startWidth and "
                                         "endWidth were expected"_qs))
         << "a zone that has no width at all is sound";
 }

@@ -268,7 +268,9 @@ TEST(SqliteObjectList, SaysWhatIsWrong)
         {{database.folder().path("none.db"), "points", {}, {}},
          "the database cannot be opened: No such file or directory",
          "no file"},
-        {{database.folder().path(), "points", {}, {}}, "a database was expected, which is a file", "a folder"},
+        {{database.folder().path(), "points", {}, {}},
+         "a database file was expected, not a folder or a device",
+         "a folder"},
     };
     for (const Row &row : rows) {
         const QStringList read = rowsOf(row.query);
@@ -392,7 +394,7 @@ TEST(SqliteObjectList, ATextThatMemoryEndsForIsNotAMissingOne)
     const sqlite3_int64 before = sqlite3_hard_heap_limit64(sqlite3_memory_used() + 6 * megabyte);
     const QStringList read = survey::rowsOf(list);
     sqlite3_hard_heap_limit64(before);
-    EXPECT_EQ(joined(read), "number=1 description=a\nerror there is not enough memory for the data");
+    EXPECT_EQ(joined(read), "number=1 description=a\nerror there is not enough memory for it");
     EXPECT_EQ(survey::rowsOf(list).size(), 2) << "with memory they are read";
 }
 
@@ -417,8 +419,8 @@ TEST(SqliteObjectList, AWriterThatWasKilledIsSaid)
     const QByteArray before = hashOf(copy.path("job.gpkg"));
     const QStringList read = rowsOf({copy.path("job.gpkg"), "points", {}, {}});
     EXPECT_EQ(joined(read),
-              "error a program that wrote to the database has not ended its work: it was expected to be opened "
-              "by that program first");
+              "error a program that wrote to the database did not finish its work: open the database with that "
+              "program first");
     EXPECT_EQ(hashOf(copy.path("job.gpkg")), before);
 }
 
