@@ -57,6 +57,9 @@ private:
         ResultOutputs results(job);
         JobRunner runner(job, std::get<JsonSource>(source), progress);
         runner.setResults(&results);
+        if (discardsText) {
+            runner.discardUnwantedText();
+        }
         const auto wrong = runner.run(report);
         notes = runner.notes();
         if (wrong) {
@@ -77,7 +80,8 @@ private:
 public:
     JobFolder folder;
     QString error;
-    QString text; ///< of the report
+    QString text;              ///< of the report
+    bool discardsText = false; ///< whether the report keeps no text that nobody wants
     kareport::JobNotes notes;
     std::map<std::string, std::string> files;
     std::map<std::string, QStringList> warnings; ///< of the outputs

@@ -28,6 +28,35 @@ TEST(ResultOutputs, RowsAreWrittenInTheUnitsOfTheData)
                                     "{\"Number\":\"2A\",\"Northing\":null}\n");
 }
 
+TEST(ResultOutputs, TheTextIsKeptWhereAnOutputHasIt)
+{
+    struct Row
+    {
+        const char *outputs;
+        bool hasText;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {R"("p.csv", "p.jsonl")", false, "values alone"},
+        {R"("p.csv", "p.txt")", true, "a text as well"},
+    };
+    constexpr int count = 100'000;
+    constexpr qsizetype widthOfRow = 10; // at least
+    QByteArray points = "Number,Northing\n";
+    for (int i = 0; i < count; ++i) {
+        points += QByteArray::number(i) + ",1.5\n";
+    }
+    for (const Row &row : rows) {
+        ResultJob job;
+        job.discardsText = true;
+        job.folder.put("points.csv", points);
+        job.run(withOutputs(templateJob(R"("p": {"csv": "points.csv"})", R"({"table": "Points", "data": "p"})"),
+                            row.outputs));
+        EXPECT_EQ(job.bytes("p.csv"), points.toStdString()) << row.reason;
+        EXPECT_EQ(job.text.size() > widthOfRow * count, row.hasText) << row.reason << ": the last piece may be there";
+    }
+}
+
 TEST(ResultOutputs, RowsAreWrittenAsPrinted)
 {
     ResultJob job;
