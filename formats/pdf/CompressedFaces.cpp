@@ -27,7 +27,9 @@ void CompressedFaces::keep(const QByteArray &face, const QByteArray &compressed)
 {
     const std::lock_guard held(lock_);
     const qint64 added = face.size() + compressed.size();
-    if (added > mostBytes) {
+    const bool isKept =
+        std::any_of(entries_.begin(), entries_.end(), [&face](const Entry &entry) { return entry.face == face; });
+    if (isKept || added > mostBytes) { // another thread may have compressed it meanwhile
         return;
     }
     entries_.push_back({face, compressed});

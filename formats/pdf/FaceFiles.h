@@ -23,5 +23,8 @@ FcPattern *describeFace(const QString &file, unsigned index);
 FT_Face openFaceFile(FT_Library library, const QString &file, unsigned index, QByteArray &bytes);
 /// Embeds a face. @return its name in the document; null when the file is missing or is not a font
 const char *embedFaceFile(HPDF_Doc document, const PdfFace &face);
+/// Counts the six letters in front of the name of a face of which a part is embedded as the library does. @param tag  zeros
+/// before the first one
+void countFaceTag(HPDF_BYTE *tag);
 
 } // namespace kareport

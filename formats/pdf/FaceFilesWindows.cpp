@@ -165,23 +165,6 @@ HPDF_Stream streamOf(HPDF_Doc document, const QByteArray &bytes)
     return stream;
 }
 
-/// The letters in front of the name of a face of which a part is embedded: AAAAAA, AAAAAB and so on, as the library counts.
-void countTag(HPDF_BYTE *tag)
-{
-    constexpr int length = 6;
-    if (tag[0] == 0) {
-        std::copy_n("HPDFAA", length, tag);
-        return;
-    }
-    for (int i = length - 1; i >= 0; --i) {
-        if (tag[i] != 'Z') {
-            ++tag[i];
-            return;
-        }
-        tag[i] = 'A';
-    }
-}
-
 } // namespace
 
 QStringList systemFontFolders()
@@ -243,13 +226,15 @@ const char *embedFaceFile(HPDF_Doc document, const PdfFace &face)
     if (definition == nullptr) {
         return nullptr;
     }
-    if (HPDF_Doc_FindFontDef(document, definition->base_font) != nullptr ||
-        HPDF_List_Add(document->fontdef_list, definition) != HPDF_OK)
-    {
+    if (HPDF_FontDef known = HPDF_Doc_FindFontDef(document, definition->base_font)) {
+        HPDF_FontDef_Free(definition);
+        return known->base_font;
+    }
+    if (HPDF_List_Add(document->fontdef_list, definition) != HPDF_OK) {
         HPDF_FontDef_Free(definition);
         return nullptr;
     }
-    countTag(document->ttfont_tag);
+    countFaceTag(document->ttfont_tag);
     HPDF_TTFontDef_SetTagName(definition, reinterpret_cast<char *>(document->ttfont_tag));
     return definition->base_font;
 }

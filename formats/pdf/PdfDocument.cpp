@@ -1,7 +1,5 @@
 #include "PdfDocument.h"
 
-#include "FaceFiles.h"
-
 #include <QIODevice>
 
 #include <hpdf_doc.h>
@@ -10,6 +8,7 @@
 
 #include <algorithm>
 #include <array>
+#include <utility>
 
 namespace kareport
 {
@@ -55,27 +54,26 @@ private:
 
 } // namespace
 
-PdfDocument::PdfDocument() : document_(HPDF_New(&PdfDocument::noteError, this))
+PdfDocument::PdfDocument() : kept_(KeptDocuments::ofProcess().take())
 {
-    if (document_ != nullptr) {
-        HPDF_UseUTFEncodings(document_);
-        HPDF_SetCurrentEncoder(document_, "UTF-8");
-        HPDF_SetCompressionMode(document_, HPDF_COMP_ALL);
-    }
+    kept_->begin(&PdfDocument::noteError, this);
+    document_ = kept_->document();
 }
 
 PdfDocument::~PdfDocument()
 {
-    if (document_ != nullptr) {
-        HPDF_Free(document_);
+    if (isSaved_) {
+        kept_->end();
+        KeptDocuments::ofProcess().keep(std::move(kept_));
     }
+    kept_.reset(); // what an error leaves is of no use to another PDF
 }
 
 void PdfDocument::noteError(HPDF_STATUS error, HPDF_STATUS /*detail*/, void *self)
 {
     // The library calls this from its own functions, which clean up after themselves when it comes back.
     auto *document = static_cast<PdfDocument *>(self);
-    if (document->error_ == HPDF_OK) {
+    if (document != nullptr && document->error_ == HPDF_OK) {
         document->error_ = error;
     }
 }
@@ -90,16 +88,12 @@ bool PdfDocument::expectPages(qint64 pages)
 
 HPDF_Font PdfDocument::loadFace(const PdfFace &face)
 {
-    if (!isGood()) {
-        return nullptr;
-    }
-    const char *name = embedFaceFile(document_, face);
-    const HPDF_FontDef definition = name != nullptr ? HPDF_GetFontDef(document_, name) : nullptr;
+    const HPDF_FontDef definition = isGood() ? kept_->definitionOf(face) : nullptr;
     if (!isGood() || definition == nullptr) {
         return nullptr;
     }
     const FaceWithoutCharacters bare(definition);
-    const HPDF_Font font = HPDF_GetFont(document_, name, "UTF-8");
+    const HPDF_Font font = HPDF_GetFont(document_, definition->base_font, "UTF-8");
     return isGood() ? font : nullptr;
 }
 
@@ -182,6 +176,7 @@ bool PdfDocument::save(QIODevice &device)
         isWritten = HPDF_ReadFromStream(document_, piece.data(), &size) == HPDF_OK &&
                     device.write(reinterpret_cast<const char *>(piece.data()), size) == qint64(size);
     }
+    isSaved_ = isWritten && isGood();
     return isWritten;
 }
 

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "KeptDocument.h"
 #include "PdfDetails.h"
 #include "PdfFaces.h"
 
@@ -7,7 +8,7 @@
 
 #include <hpdf.h>
 
-#include <vector>
+#include <memory>
 
 class QIODevice;
 
@@ -52,7 +53,9 @@ private:
 
     bool addText(HPDF_Dict dictionary, const char *key, const QString &text);
 
-    HPDF_Doc document_;
+    std::unique_ptr<KeptDocument> kept_;
+    HPDF_Doc document_ = nullptr;
+    bool isSaved_ = false;
     HPDF_Page lastPage_ = nullptr;
     HPDF_STATUS error_ = HPDF_OK;
 };

@@ -1,6 +1,7 @@
 #include "ReportSubject.h"
 
 #include "CompressedFaces.h"
+#include "KeptDocument.h"
 #include "PdfExport.h"
 
 #include <QBuffer>
@@ -35,6 +36,12 @@ void expectWholeOrSaid(bool isDescribed, bool isKept)
     const qint64 allocations = failingEachAllocation([&](qint64 number) {
         if (!isKept) {
             kareport::CompressedFaces::ofProcess().keep(QByteArray(kareport::CompressedFaces::mostBytes - 1, 'x'), "x");
+            kareport::KeptDocuments::ofProcess().clear();
+        } else { // what failed before has left no document
+            QBuffer earlier;
+            earlier.open(QIODevice::WriteOnly);
+            EXPECT_TRUE(report.WritePdf(earlier, nullptr, {}, isDescribed ? &details : nullptr));
+            EXPECT_TRUE(earlier.data() == whole.data()) << number;
         }
         QBuffer device;
         device.open(QIODevice::WriteOnly);

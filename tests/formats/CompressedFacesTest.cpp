@@ -21,6 +21,8 @@ TEST(CompressedFaces, AreFoundByTheirContent)
     EXPECT_TRUE(faces.find("a fac").isEmpty());
     EXPECT_TRUE(faces.find("").isEmpty());
     EXPECT_EQ(faces.size(), 14);
+    faces.keep("a face", "x");
+    EXPECT_EQ(faces.size(), 14) << "as when two threads compress the same one";
 }
 
 TEST(CompressedFaces, WhatWasUsedLastIsKept)

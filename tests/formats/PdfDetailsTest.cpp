@@ -1,4 +1,5 @@
 #include "CompressedFaces.h"
+#include "KeptDocument.h"
 #include "PdfFixture.h"
 
 #include <gtest/gtest.h>
@@ -223,6 +224,7 @@ TEST(PdfDetails, TheSecondPdfOfAProcessHasTheBytesOfTheFirst)
         kareport::CompressedFaces &kept = kareport::CompressedFaces::ofProcess();
         kept.keep(QByteArray(kareport::CompressedFaces::mostBytes - 1, 'x'), "y");
         EXPECT_EQ(kept.size(), kareport::CompressedFaces::mostBytes);
+        kareport::KeptDocuments::ofProcess().clear();
     };
     forgetFaces();
     const QByteArray first = pdfBytes(text);
