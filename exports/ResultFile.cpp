@@ -25,6 +25,12 @@ std::string_view ResultFile::page(std::size_t number) const
     return bytes().substr(start, number < pages_.size() ? pages_[number] - start : std::string_view::npos);
 }
 
+void ResultFile::release(std::string_view read) const
+{
+    const auto begin = static_cast<std::size_t>(read.data() - bytes().data());
+    spool_.release(begin, begin + read.size());
+}
+
 bool ResultFile::finish()
 {
     writeEnd();

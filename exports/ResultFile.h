@@ -29,6 +29,8 @@ public:
     std::size_t pageCount() const { return pages_.empty() ? 1 : pages_.size(); }
     /// The bytes of a page, from 1, after `finish` has answered true.
     std::string_view page(std::size_t number) const;
+    /// Gives the memory of bytes that were read back to the system. They can be read again. @param read  a part of `bytes`
+    void release(std::string_view read) const;
     /// What went wrong, as a sentence; empty when nothing did.
     QString problem() const { return problem_; }
     /// What a reader of the file should know, as sentences, after `finish`.

@@ -176,6 +176,7 @@ private:
                 return false;
             }
             at += piece.size();
+            results_->release(piece); // no output is in memory as a whole
         }
         return true;
     }

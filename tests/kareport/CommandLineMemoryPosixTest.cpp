@@ -147,11 +147,12 @@ QByteArray jobOf(const char *set)
            set + "}}}";
 }
 
-QByteArray manyRows(int count)
+/// @param name  that every number begins with @param perNumber  how many rows have the same
+QByteArray manyRows(int count, const QByteArray &name = {}, int perNumber = 1)
 {
     QByteArray csv = "Number,Northing\n";
     for (int i = 0; i < count; ++i) {
-        csv += QByteArray::number(1'000'000'000 + i) + ",12345.678000000000000000000000000000\n";
+        csv += name + QByteArray::number(1'000'000'000 + i / perNumber) + ",12345.678000000000000000000000000000\n";
     }
     return csv;
 }
@@ -229,6 +230,57 @@ TEST(CommandLineMemory, DoesNotGrowWithTheRowsOfAPipe)
         ASSERT_GT(many, 0) << set;
         EXPECT_LT(many - few, mostKilobytes) << set << ": " << few << " and " << many;
     }
+}
+
+TEST(CommandLineMemory, DoesNotGrowWithTheRowsOfAnyOutput)
+{
+#if defined(__SANITIZE_ADDRESS__)
+    GTEST_SKIP() << "the address sanitizer keeps what was freed";
+#endif
+    const CommandLineFolder folder;
+    folder.put("job.json", jobOf(R"("csv": "points.csv")"));
+    for (const char *output : {"-o out.csv", "-o out.jsonl", "-o out.html", "-o out.xlsx", "-o - --as csv >out.csv"}) {
+        const auto peak = [&](int rows) {
+            folder.put("points.csv", manyRows(rows, QByteArray(60, 'n'))); // the least of the outputs has 16 MB more
+            return peakOfCommand(folder.path(), QByteArray("kareport render job.json --quiet ") + output);
+        };
+        const long few = peak(20'000);
+        const long many = peak(220'000);
+        ASSERT_GT(few, 0) << output;
+        ASSERT_GT(many, 0) << output;
+        EXPECT_LT(many - few, mostKilobytes) << output << ": " << few << " and " << many;
+    }
+}
+
+TEST(CommandLineMemory, OfTotalsUnderRowsDoesNotGrow)
+{
+#if defined(__SANITIZE_ADDRESS__)
+    GTEST_SKIP() << "the address sanitizer keeps what was freed";
+#endif
+    const CommandLineFolder folder;
+    folder.put("t.xml", controlTemplates().replace("<Sort></Sort>", "")); // the step sorts
+    const auto peak = [&folder](int rows, const QByteArray &keys) {
+        folder.put("points.csv", manyRows(rows, {}, 100));
+        folder.put("job.json",
+                   jobOf(R"("csv": "points.csv")").replace(R"("data": "p"})", R"("data": "p", )" + keys + "}"));
+        return peakOf(folder.path(), "job.json");
+    };
+    const QByteArray totals = R"("totals": [{"label": "{count}", "sum": "Northing"}],
+        "pageTotals": [{"label": "{mean:Northing}", "sum": "Northing"}])";
+    const long few = peak(fewRows, totals);
+    const long many = peak(fewRows + moreRows, totals);
+    ASSERT_GT(few, 0);
+    ASSERT_GT(many, 0);
+    EXPECT_LT(many - few, mostKilobytes) << few << " and " << many;
+    // Groups are of sorted rows: with totals under them they take what the sorting takes.
+    const QByteArray sort = R"("sort": "Number")";
+    const long sorted = peak(fewRows + moreRows, sort);
+    const long grouped = peak(fewRows + moreRows, sort + R"(, "groups": [{"by": "Number", "heading": "{Number}",
+        "totals": [{"label": "{count}", "mean": "Northing"}]}], )" +
+                                                      totals);
+    ASSERT_GT(sorted, 0);
+    ASSERT_GT(grouped, 0);
+    EXPECT_LT(grouped - sorted, mostKilobytes) << sorted << " and " << grouped;
 }
 
 TEST(CommandLineMemory, OfASortedTableIsThatOfItsKeysAndPlaces)
