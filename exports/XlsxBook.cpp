@@ -1,12 +1,12 @@
 #include "XlsxBook.h"
 
 #include "DataText.h"
+#include "PlainNumbers.h"
 #include "SystemPath.h"
 #include "Xlate.h"
 
 #include <algorithm>
 #include <cerrno>
-#include <clocale>
 #include <cstdio>
 #include <new>
 #include <utility>
@@ -19,15 +19,6 @@ namespace
 
 constexpr qsizetype mostCharacters = 32'767; ///< of a cell
 constexpr qsizetype escapeLength = 7;        ///< of _x0041_
-
-int openBooks = 0;
-
-/// The locale of numbers before the first of the open books; the last of them sets it again.
-std::string &localeBefore()
-{
-    static std::string locale;
-    return locale;
-}
 
 /// Whether a text has an escape of the file format at a position, such as _x0041_.
 bool isEscape(QStringView text, qsizetype at)
@@ -89,21 +80,6 @@ qsizetype appendSheetText(std::string &out, QStringView text, qsizetype most)
     return i;
 }
 
-XlsxBook::PlainNumbers::PlainNumbers()
-{
-    if (openBooks++ == 0) {
-        localeBefore() = std::setlocale(LC_NUMERIC, nullptr);
-        std::setlocale(LC_NUMERIC, "C");
-    }
-}
-
-XlsxBook::PlainNumbers::~PlainNumbers()
-{
-    if (--openBooks == 0) {
-        std::setlocale(LC_NUMERIC, localeBefore().c_str());
-    }
-}
-
 XlsxBook::XlsxBook() : folderName_(pathForLibrary(folder_.path()))
 {
     lxw_workbook_options options = {};
@@ -159,6 +135,7 @@ void XlsxBook::setProperties(lxw_doc_properties properties)
 void XlsxBook::writeText(lxw_worksheet *sheet, lxw_row_t row, lxw_col_t column, QStringView text, lxw_format *format)
 {
     text_.clear();
+    const PlainNumbers plain; // with the first cell of a row, the library writes the row before it
     cutTexts_ += appendSheetText(text_, text, mostCharacters) < text.size() ? 1U : 0U;
     worksheet_write_string(sheet, row, column, text_.c_str(), format);
 }
@@ -166,11 +143,13 @@ void XlsxBook::writeText(lxw_worksheet *sheet, lxw_row_t row, lxw_col_t column, 
 void XlsxBook::writeFormula(lxw_worksheet *sheet, lxw_row_t row, lxw_col_t column, const std::string &formula,
                             double value, lxw_format *format)
 {
+    const PlainNumbers plain;
     worksheet_write_formula_num(sheet, row, column, formula.c_str(), format, value);
 }
 
 void XlsxBook::writeNumber(lxw_worksheet *sheet, lxw_row_t row, lxw_col_t column, double number, lxw_format *format)
 {
+    const PlainNumbers plain;
     worksheet_write_number(sheet, row, column, number, format);
 }
 
@@ -188,6 +167,7 @@ QString XlsxBook::close()
     if (!areRowsWritten()) {
         return Xlate("the workbook could not be put together: %1").arg(qt_error_string(errno));
     }
+    const PlainNumbers plain;
     const lxw_error error = workbook_close(std::exchange(book_, nullptr));
     if (error == LXW_ERROR_MEMORY_MALLOC_FAILED) {
         throw std::bad_alloc();

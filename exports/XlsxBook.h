@@ -36,9 +36,6 @@ struct CellLook
 };
 
 /// A workbook that is written row after row into a folder of its own, so that memory does not grow with it.
-///
-/// While it is open, numbers of the C library are written as in the "C" locale: the library that makes workbooks writes them
-/// with it.
 class XlsxBook
 {
 public:
@@ -70,19 +67,8 @@ public:
     QString path() const { return folder_.filePath(QStringLiteral("book.xlsx")); }
 
 private:
-    /// Keeps the C library's numbers as in the "C" locale while there is one.
-    class PlainNumbers
-    {
-    public:
-        PlainNumbers();
-        ~PlainNumbers();
-        PlainNumbers(const PlainNumbers &) = delete;
-        PlainNumbers &operator=(const PlainNumbers &) = delete;
-    };
-
     bool areRowsWritten() const;
 
-    PlainNumbers plainNumbers_;
     QTemporaryDir folder_;
     QByteArray folderName_;
     lxw_workbook *book_ = nullptr;

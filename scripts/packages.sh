@@ -34,6 +34,7 @@ packages_test=(
     cups-daemon cups-client # a print queue
     cups-filters cups-filters-core-drivers cups-core-drivers # what a queue makes of a job
     postgresql              # a database server
+    locales                 # a language with a decimal comma
     fonts-liberation2       # a second fixed-pitch face
     fonts-wqy-zenhei        # a face with CJK
     qt6-translations-l10n   # Qt's own texts in other languages

@@ -1,3 +1,4 @@
+#include "CommaLocale.h"
 #include "ResultJob.h"
 #include "Workbook.h"
 
@@ -94,16 +95,13 @@ TEST(XlsxResult, TheSameJobIsTheSameBytes)
 
 TEST(XlsxResult, NumbersDoNotDependOnTheLocale)
 {
-    const std::string before = std::setlocale(LC_NUMERIC, nullptr);
-    const char *found = nullptr;
-    for (const char *name : {"de_DE.UTF-8", "de_DE.utf8", "fr_FR.UTF-8"}) {
-        found = found == nullptr ? std::setlocale(LC_NUMERIC, name) : found;
+    const CommaLocale comma;
+    if (!comma.isThere()) {
+        GTEST_SKIP() << "no locale with a decimal comma can be made";
     }
     ResultJob job;
     job.run(withOutput(templateJob(points, oneTable)));
-    const std::string after = std::setlocale(LC_NUMERIC, nullptr);
-    EXPECT_EQ(after, found != nullptr ? std::string(found) : before) << "it is as it was";
-    std::setlocale(LC_NUMERIC, before.c_str());
+    EXPECT_EQ(std::setlocale(LC_NUMERIC, nullptr), comma.name()) << "it is as it was";
     EXPECT_THAT(Workbook(job).cells(1), HasSubstr("B2 n 12.346 0.000\n"));
 }
 

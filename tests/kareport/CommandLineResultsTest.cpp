@@ -1,3 +1,4 @@
+#include "CommaLocale.h"
 #include "CommandLine.h"
 
 #include <QDir>
@@ -133,6 +134,49 @@ TEST(CommandLineResults, ASavedReportHasNoValues)
     const ProgramRun run = folder.run("convert a.rep a.csv");
     EXPECT_EQ(run.status, 1) << run.all().constData();
     EXPECT_THAT(run.err.toStdString(), HasSubstr("cannot be made from a saved report"));
+}
+
+TEST(CommandLineResults, NumbersDoNotDependOnTheLocale)
+{
+    const CommaLocale comma;
+    if (!comma.isThere()) {
+        GTEST_SKIP() << "no locale with a decimal comma can be made";
+    }
+    const CommandLineFolder folder;
+    folder.put("points.csv", "Number,Northing\n1,1234.5\n2,0.1\n3,-1e-7\n");
+    folder.put("job.json", R"({"now": "2024-03-05T14:07:00", "page": {"linesPerPage": 72, "charsPerRow": 80}, "pdf": {},
+        "template": {"file": "t.xml", "name": "CONTROL"}, "data": {"p": {"csv": "points.csv"}},
+        "report": [{"table": "Points", "data": "p", "where": [{"of": "Northing", "below": "2000.5"}],
+                    "totals": [{"label": "{mean:Northing}", "sum": "Northing"}]}]})");
+    const QStringList names = words("a.rep a.txt a.pdf a.xlsx a.html a.csv a.jsonl");
+    const auto outputs = [&](const QByteArray &locale) {
+        QStringList arguments = words("render job.json");
+        for (const QString &name : names) {
+            arguments << QStringLiteral("-o") << name;
+        }
+        const ProgramRun run = runProgram(folder.path(), arguments,
+                                          {{"LC_ALL", ""}, {"LANG", "C.UTF-8"}, {"LC_NUMERIC", locale.constData()}});
+        EXPECT_EQ(run.status, 0) << run.all().constData();
+        std::vector<QByteArray> bytes;
+        for (const QString &name : names) {
+            bytes.push_back(folder.bytesOf(name.toUtf8().constData()));
+            EXPECT_FALSE(bytes.back().isEmpty()) << name.toStdString();
+            EXPECT_TRUE(QFile::remove(folder.path(name.toUtf8().constData())));
+        }
+        return bytes;
+    };
+    // Programs find the locale.
+    QProcess other;
+    QProcessEnvironment environment = QProcessEnvironment::systemEnvironment();
+    environment.insert(QStringLiteral("LC_ALL"), QString::fromUtf8(comma.name()));
+    other.setProcessEnvironment(environment);
+    other.start(QStringLiteral("printf"), words("%.1f 0"));
+    EXPECT_EQ(endOf(other).out, "0,0");
+    const std::vector<QByteArray> plain = outputs("C");
+    const std::vector<QByteArray> withComma = outputs(comma.name());
+    for (std::size_t i = 0; i < plain.size(); ++i) {
+        EXPECT_TRUE(withComma[i] == plain[i]) << names[static_cast<qsizetype>(i)].toStdString();
+    }
 }
 
 } // namespace
