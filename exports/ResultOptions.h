@@ -2,6 +2,9 @@
 
 #include <QString>
 
+#include <cstddef>
+#include <optional>
+
 namespace kareport
 {
 
@@ -19,9 +22,10 @@ struct ResultOptions
     static constexpr int usualRowsPerPage = 20'000; ///< with more, browsers become slow
 
     // The step whose rows it has, where it has those of one alone; empty for any.
-    QString table; ///< the name of a table of the template
-    QString block; ///< or of a block
-    QString data;  ///< the name of the data set that is written through it
+    QString table;                   ///< the name of a table of the template
+    QString block;                   ///< or of a block
+    QString data;                    ///< the name of the data set that is written through it
+    std::optional<std::size_t> step; ///< or the step itself, by its place in the job
 
     ResultValues values = ResultValues::Data;
     char delimiter = ','; ///< of CSV

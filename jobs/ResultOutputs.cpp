@@ -50,17 +50,6 @@ std::vector<std::size_t> stepsOf(const Job &job, const QString &name, const QStr
     return steps;
 }
 
-/// The steps whose rows an output of one table may have: those of a table or, where it does not ask for one, of a block.
-std::vector<std::size_t> stepsFor(const Job &job, const ResultOptions &options)
-{
-    auto steps = options.block.isEmpty() ? stepsOf<Job::Table>(job, options.table, options.data)
-                                         : stepsOf<Job::Block>(job, options.block, options.data);
-    if (steps.empty() && options.table.isEmpty() && options.block.isEmpty()) {
-        steps = stepsOf<Job::Block>(job, QString(), options.data);
-    }
-    return steps;
-}
-
 /// The name of the data set that a step writes; empty for one without data.
 QString dataOf(const Job::Step &step)
 {
@@ -94,7 +83,7 @@ std::optional<OutputClash> ResultOutputs::wrongResult(const Job &job)
 {
     for (std::size_t i = 0; i < job.outputs.size(); ++i) {
         const Output &output = job.outputs[i];
-        const auto steps = isOfOneTable(output.kind) ? stepsFor(job, output.results) : std::vector<std::size_t>(1);
+        const auto steps = isOfOneTable(output.kind) ? possibleSteps(job, output.results) : std::vector<std::size_t>(1);
         if (steps.size() == 1) {
             continue;
         }
@@ -109,6 +98,20 @@ std::optional<OutputClash> ResultOutputs::wrongResult(const Job &job)
     return std::nullopt;
 }
 
+/// Those of a table or, where the output does not ask for one, of a block.
+std::vector<std::size_t> ResultOutputs::possibleSteps(const Job &job, const ResultOptions &options)
+{
+    if (options.step) {
+        return {*options.step};
+    }
+    auto steps = options.block.isEmpty() ? stepsOf<Job::Table>(job, options.table, options.data)
+                                         : stepsOf<Job::Block>(job, options.block, options.data);
+    if (steps.empty() && options.table.isEmpty() && options.block.isEmpty()) {
+        steps = stepsOf<Job::Block>(job, QString(), options.data);
+    }
+    return steps;
+}
+
 bool ResultOutputs::isTextUnwanted(const Job &job)
 {
     return std::all_of(job.outputs.begin(), job.outputs.end(),
@@ -119,7 +122,7 @@ bool ResultOutputs::isTextUnwanted(const Job &job)
 ResultOutputs::ResultOutputs(const Job &job) : job_(job), firstStep_(firstKeptStep(job))
 {
     for (const Output &output : job.outputs) {
-        const auto steps = isOfOneTable(output.kind) ? stepsFor(job, output.results) : std::vector<std::size_t>();
+        const auto steps = isOfOneTable(output.kind) ? possibleSteps(job, output.results) : std::vector<std::size_t>();
         auto file = makeFile(output, steps.empty() ? nullptr : &job.steps[steps.front()]);
         if (!file) {
             continue;

@@ -27,6 +27,9 @@ public:
     /// The first output of a job that does not say which of the steps it has.
     static std::optional<OutputClash> wrongResult(const Job &job);
 
+    /// The steps whose rows an output of one table may have, by their places in the job: one where it says which.
+    static std::vector<std::size_t> possibleSteps(const Job &job, const ResultOptions &options);
+
     /// Whether the text of a job's report is of no use once its values are written: no output has it, no limit measures it,
     /// and no step takes it back.
     static bool isTextUnwanted(const Job &job);

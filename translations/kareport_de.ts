@@ -2069,6 +2069,11 @@
     </message>
     <message>
         <location filename="../jobs/GroupBinding.cpp"/>
+        <source>"rounding" goes with totals: a total was expected in the step</source>
+        <translation>"rounding" gehört zu Summen: eine Summe wurde im Schritt erwartet</translation>
+    </message>
+    <message>
+        <location filename="../jobs/GroupBinding.cpp"/>
         <source>groups by %1 need rows that are sorted by them first</source>
         <translation>Gruppen nach %1 brauchen Zeilen, die zuerst danach sortiert sind</translation>
     </message>
@@ -3861,6 +3866,16 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/SavedReports.cpp"/>
         <source>"%1" is a folder, a pipe or a device. Only files can be opened here.</source>
         <translation>„%1“ ist ein Ordner, eine Pipe oder ein Gerät. Hier lassen sich nur Dateien öffnen.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TableQuestion.cpp"/>
+        <source>Export Values</source>
+        <translation>Werte exportieren</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TableQuestion.cpp"/>
+        <source>A file of this kind has the rows of &amp;one table:</source>
+        <translation>Eine Datei dieser Art hat die Zeilen &amp;einer Tabelle:</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>

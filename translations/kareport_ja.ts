@@ -2069,6 +2069,11 @@
     </message>
     <message>
         <location filename="../jobs/GroupBinding.cpp"/>
+        <source>"rounding" goes with totals: a total was expected in the step</source>
+        <translation>"rounding" は集計とともに使います: ステップに集計が必要です</translation>
+    </message>
+    <message>
+        <location filename="../jobs/GroupBinding.cpp"/>
         <source>groups by %1 need rows that are sorted by them first</source>
         <translation>%1 によるグループには、まずその順に並んだ行が必要です</translation>
     </message>
@@ -3861,6 +3866,16 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/SavedReports.cpp"/>
         <source>"%1" is a folder, a pipe or a device. Only files can be opened here.</source>
         <translation>「%1」はフォルダー、パイプ、またはデバイスです。ここで開けるのはファイルだけです。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TableQuestion.cpp"/>
+        <source>Export Values</source>
+        <translation>値のエクスポート</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TableQuestion.cpp"/>
+        <source>A file of this kind has the rows of &amp;one table:</source>
+        <translation>この種類のファイルには 1 つの表の行が入ります(&amp;T):</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>

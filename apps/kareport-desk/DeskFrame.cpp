@@ -21,6 +21,7 @@
 #include "Session.h"
 #include "StartPage.h"
 #include "TabClosing.h"
+#include "TableQuestion.h"
 #include "TemplateDialog.h"
 #include "UApplication.h"
 #include "UReportDoc.h"
@@ -77,6 +78,7 @@ void DeskFrame::askNames()
         const std::optional<kareport::SaveChoice> choice = kareport::askSavePath(this, request);
         return choice ? std::optional(choice->path) : std::nullopt;
     };
+    askTable = [this](const QStringList &tables) { return kareport::askExportedTable(this, tables); };
     askTemplate = [this](const QString &templateFile) -> std::optional<kareport::TemplateJob> {
         kareport::TemplateDialog dialog(this);
         if (!templateFile.isEmpty()) {

@@ -4,7 +4,7 @@
 #include "DeskRuns.h"
 #include "EditorHold.h"
 #include "FileWatch.h"
-#include "JobExport.h"
+#include "JobLauncher.h"
 #include "OutputKind.h"
 #include "Recovery.h"
 #include "SaveAs.h"
@@ -75,6 +75,8 @@ public:
 
     /// Asks where the values of a report go; a test answers instead.
     std::function<std::optional<QString>(const kareport::SaveRequest &)> askExport;
+    /// Asks which of several tables a file has the rows of; a test answers instead.
+    kareport::AskTable askTable;
     /// Asks where a report is exported to; a test answers instead.
     std::function<std::optional<kareport::SaveChoice>(const kareport::SaveRequest &)> askExportFile;
 

@@ -97,14 +97,15 @@ void DeskFrame::exportValues()
         return;
     }
     SetLastOpenDir(*file, kareport::lastReportFolder);
-    QStringList warnings;
-    const QString problem = kareport::launchExport(recipe, *file, this, warnings);
-    if (!problem.isEmpty()) {
-        AppMessageBox(problem);
-    } else if (!warnings.isEmpty()) {
+    const kareport::ExportResult result = kareport::launchExport(recipe, *file, this, askTable);
+    if (!result.error.isEmpty()) {
+        AppMessageBox(result.error);
+    } else if (!result.warnings.isEmpty()) {
         kareport::showMessage(
-            {Xlate("\"%1\" was saved, but it differs from the report:\n\n%2").arg(*file, warnings.join(u'\n')),
+            {Xlate("\"%1\" was saved, but it differs from the report:\n\n%2").arg(*file, result.warnings.join(u'\n')),
              QString(), MessageButtons::Ok, kareport::MessageIcon::Information});
+    } else if (result.isWritten) {
+        statusBar()->showMessage(Xlate("Exported to \"%1\".").arg(*file));
     }
 }
 

@@ -14,6 +14,8 @@
 #include <QFile>
 #include <QFileInfo>
 
+#include <variant>
+
 namespace kareport
 {
 
@@ -85,7 +87,7 @@ QString exportFilter()
            Xlate("Rows as JSON Lines") + QStringLiteral(" (*.jsonl)|*.jsonl||");
 }
 
-QString exportJob(const ReportRecipe &recipe, const QString &file, Progress &progress, QStringList &warnings)
+QString JobExport::open(const ReportRecipe &recipe, const QString &file)
 {
     const auto kind = outputKindOf(file);
     if (!kind || !isMadeOfResults(*kind)) {
@@ -95,23 +97,65 @@ QString exportJob(const ReportRecipe &recipe, const QString &file, Progress &pro
     if (const InputError *wrong = errorOf(read)) {
         return wrong->message();
     }
-    const auto &source = std::get<JsonSource>(read);
-    auto job = readJob(source, loadPreferences().jobDefaults());
+    source_ = std::make_unique<JsonSource>(std::get<JsonSource>(read));
+    const auto job = readJob(*source_, loadPreferences().jobDefaults());
     if (const InputError *wrong = errorOf(job)) {
         return wrong->message();
     }
+    job_ = std::make_unique<Job>(std::get<Job>(job));
     // Of the job's own outputs, the one of the kind says which rows are wanted, and how.
-    Output output{file, *kind};
-    for (const Output &own : std::get<Job>(job).outputs) {
+    for (const Output &own : job_->outputs) {
         if (own.kind == *kind) {
-            output.results = own.results;
-            break;
+            own_.push_back(own);
         }
     }
-    std::get<Job>(job).outputs.clear();
-    std::get<Job>(job).outputs.push_back(output);
-    const QString wrong = wrongExport(std::get<Job>(job), source.path());
-    return !wrong.isEmpty() ? wrong : writeExport(std::get<Job>(job), source, progress, warnings);
+    Output output{file, *kind};
+    if (!own_.empty()) {
+        output.results = own_.front().results;
+    }
+    job_->outputs.clear();
+    job_->outputs.push_back(output);
+    if (isOfOneTable(*kind)) {
+        findChoices();
+    }
+    return choices_.isEmpty() ? wrongExport(*job_, source_->path()) : QString();
+}
+
+/// Finds what the file may have the rows of.
+void JobExport::findChoices()
+{
+    Output &output = job_->outputs.front();
+    const ResultOptions any;
+    const ResultOptions &wanted = own_.size() > 1 ? any : output.results; // several may be of several tables
+    steps_ = ResultOutputs::possibleSteps(*job_, wanted);
+    if (steps_.size() < 2) {
+        return;
+    }
+    output.results = wanted;
+    for (const std::size_t step : steps_) {
+        const auto &action = job_->steps[step].action;
+        const auto *table = std::get_if<Job::Table>(&action);
+        const auto *block = std::get_if<Job::Block>(&action);
+        choices_.append(QStringLiteral("%1 (%2)").arg(table != nullptr ? table->name : block->name,
+                                                      table != nullptr ? table->data : block->data));
+    }
+}
+
+void JobExport::choose(std::size_t choice)
+{
+    Output &output = job_->outputs.front();
+    for (const Output &own : own_) { // which may say how the rows of this one are written
+        if (ResultOutputs::possibleSteps(*job_, own.results) == std::vector<std::size_t>{steps_[choice]}) {
+            output.results = own.results;
+        }
+    }
+    output.results.step = steps_[choice];
+}
+
+QString JobExport::write(Progress &progress, QStringList &warnings) const
+{
+    const QString wrong = wrongExport(*job_, source_->path());
+    return !wrong.isEmpty() ? wrong : writeExport(*job_, *source_, progress, warnings);
 }
 
 } // namespace kareport

@@ -155,15 +155,27 @@ bool launchAgain(UReportDoc &report, const ReportRecipe &recipe, QWidget *parent
     return isMade;
 }
 
-QString launchExport(const ReportRecipe &recipe, const QString &file, QWidget *parent, QStringList &warnings)
+ExportResult launchExport(const ReportRecipe &recipe, const QString &file, QWidget *parent, const AskTable &askTable)
 {
-    QString problem;
-    QString error;
-    const bool isDone = doAsOnlyJob(error, [&] {
+    ExportResult result;
+    doAsOnlyJob(result.error, [&] {
+        JobExport values;
+        result.error = values.open(recipe, file);
+        if (!result.error.isEmpty()) {
+            return;
+        }
+        if (!values.choices().isEmpty()) {
+            const auto choice = askTable(values.choices());
+            if (!choice) {
+                return;
+            }
+            values.choose(*choice);
+        }
         DialogProgress progress(parent);
-        problem = exportJob(recipe, file, progress, warnings);
+        result.error = values.write(progress, result.warnings);
+        result.isWritten = result.error.isEmpty() && !isInterrupted();
     });
-    return isDone ? problem : error;
+    return result;
 }
 
 } // namespace kareport

@@ -8,7 +8,9 @@
 #include <QString>
 #include <QStringList>
 
+#include <cstddef>
 #include <functional>
+#include <optional>
 
 class QWidget;
 class UReportDoc;
@@ -45,8 +47,18 @@ UReportDoc *launchJob(const ReportRecipe &recipe, QWidget *parent, LaunchResult 
 bool launchAgain(UReportDoc &report, const ReportRecipe &recipe, QWidget *parent, LaunchResult &result,
                  const LaunchHooks &hooks = {});
 
-/// Writes the values of a report into a file, as `exportJob` does, with a window that shows progress and can stop it.
-/// @return as `exportJob`
-QString launchExport(const ReportRecipe &recipe, const QString &file, QWidget *parent, QStringList &warnings);
+/// Asks which of several tables a file has the rows of. @return its place; nothing for none
+using AskTable = std::function<std::optional<std::size_t>(const QStringList &tables)>;
+
+/// What became of values that were written for another program.
+struct ExportResult
+{
+    QString error;        ///< what went wrong; empty when the work was stopped
+    QStringList warnings; ///< what a reader of the file should know
+    bool isWritten = false;
+};
+
+/// Writes the values of a report into a file, as `JobExport` does, with a window that shows progress and can stop it.
+ExportResult launchExport(const ReportRecipe &recipe, const QString &file, QWidget *parent, const AskTable &askTable);
 
 } // namespace kareport
