@@ -59,12 +59,11 @@ RowCondition bindCondition(const TableShape::Condition &condition, VariableLooku
     }
     bound.id = of.id;
     bound.reader = of.reader;
-    if (condition.kind == u"exists") {
-        bound.kind = condition.values.front().value.toBool() ? Kind::Exists : Kind::Missing;
+    bound.kind = condition.kind;
+    if (bound.kind == Kind::Exists || bound.kind == Kind::Missing) {
         return bound;
     }
-    if (condition.kind.startsWith(u"is")) {
-        bound.kind = condition.kind == u"is" ? Kind::Is : Kind::IsNot;
+    if (bound.kind == Kind::Is || bound.kind == Kind::IsNot) {
         for (const TableShape::Value &value : condition.values) {
             if (const auto entry = lookup.valueOf(of, value)) {
                 bound.values.push_back(*entry);
@@ -72,7 +71,6 @@ RowCondition bindCondition(const TableShape::Condition &condition, VariableLooku
         }
         return bound;
     }
-    bound.kind = condition.kind == u"above" ? Kind::Above : condition.kind == u"below" ? Kind::Below : Kind::Outside;
     bindLimit(bound, condition, of, lookup);
     return bound;
 }

@@ -13,16 +13,6 @@ namespace kareport
 namespace
 {
 
-constexpr struct
-{
-    QStringView key;
-    RowFormula::Kind kind;
-} formulaKinds[] = {{u"sum", RowFormula::Kind::Sum},
-                    {u"difference", RowFormula::Kind::Difference},
-                    {u"product", RowFormula::Kind::Product},
-                    {u"distance", RowFormula::Kind::Distance},
-                    {u"bearing", RowFormula::Kind::Bearing}};
-
 /// What a formula of operands measures; nothing where they do not go together.
 std::optional<Measure> formulaMeasure(RowFormula::Kind kind, const std::vector<FoundVariable> &operands)
 {
@@ -73,9 +63,7 @@ std::optional<RowFormula> bindFormula(const TableShape::Formula &formula, const 
         return std::nullopt;
     }
     RowFormula bound;
-    for (const auto &row : formulaKinds) {
-        bound.kind = row.key == formula.kind ? row.kind : bound.kind;
-    }
+    bound.kind = formula.kind;
     const auto measure = formulaMeasure(bound.kind, operands);
     if (!measure || *measure == Measure::Thickness) {
         lookup.fail(

@@ -15,15 +15,6 @@ namespace kareport
 namespace
 {
 
-TotalKind kindOf(QStringView key)
-{
-    return key == u"sum"    ? TotalKind::Sum
-           : key == u"mean" ? TotalKind::Mean
-           : key == u"min"  ? TotalKind::Least
-           : key == u"max"  ? TotalKind::Greatest
-                            : TotalKind::Count;
-}
-
 QString quoted(const QStringList &names)
 {
     return u'"' + names.join(QStringLiteral("\", \"")) + u'"';
@@ -39,6 +30,9 @@ TableGroups GroupBinding::bind(const TableShape &shape, const std::vector<unsign
     groups_.addsPrinted = shape.addsPrinted;
     if (!lookup_.error()) {
         checkSort(shape, sortIds);
+    }
+    if (shape.rounding && groups_.variables.empty()) {
+        lookup_.fail(*shape.rounding, Xlate("\"rounding\" was expected only with totals"));
     }
     return std::move(groups_);
 }
@@ -95,11 +89,11 @@ void GroupBinding::checkSort(const TableShape &shape, const std::vector<unsigned
                                      : Xlate("they are sorted by %1").arg(quoted(keys))));
 }
 
-TotalCell GroupBinding::total(const QString &kind, const TableShape::Name &name)
+TotalCell GroupBinding::total(TotalKind kind, const TableShape::Name &name)
 {
     const FoundVariable variable = lookup_.find(name);
     TotalCell cell;
-    cell.kind = kindOf(kind);
+    cell.kind = kind;
     if (lookup_.error()) {
         return cell;
     }
@@ -133,8 +127,7 @@ TotalCell GroupBinding::total(const QString &kind, const TableShape::Name &name)
 GroupText GroupBinding::text(const TableShape::Name &name, const std::vector<FoundVariable> &by)
 {
     return readGroupText(
-        name, by, [this](const QString &kind, const TableShape::Name &variable) { return total(kind, variable); },
-        lookup_);
+        name, by, [this](TotalKind kind, const TableShape::Name &variable) { return total(kind, variable); }, lookup_);
 }
 
 std::vector<TotalLine> GroupBinding::lines(const std::vector<TableShape::TotalLine> &lines,

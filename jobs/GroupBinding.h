@@ -21,7 +21,7 @@ public:
 private:
     void bindLevels(const TableShape &shape);
     void checkSort(const TableShape &shape, const std::vector<unsigned> &sortIds);
-    TotalCell total(const QString &kind, const TableShape::Name &name);
+    TotalCell total(TotalKind kind, const TableShape::Name &name);
     std::vector<TotalLine> lines(const std::vector<TableShape::TotalLine> &lines, const std::vector<FoundVariable> &by);
     GroupText text(const TableShape::Name &name, const std::vector<FoundVariable> &by);
 

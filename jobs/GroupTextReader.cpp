@@ -1,6 +1,7 @@
 #include "GroupTextReader.h"
 
 #include "PlaceholderPiece.h"
+#include "ShapeKeys.h"
 #include "TextFolding.h"
 #include "UnitFactors.h"
 
@@ -39,9 +40,11 @@ QStringList expectedNames(const std::vector<FoundVariable> &by)
     for (const FoundVariable &variable : by) {
         names.append(inBraces(variable.name));
     }
-    for (const char *name : {"{count}", "{sum:...}", "{mean:...}", "{min:...}", "{max:...}", "{count:...}",
-                             "{lengthUnit}", "{areaUnit}", "{angleUnit}"})
-    {
+    names.append(QStringLiteral("{count}"));
+    for (const ShapeKey<TotalKind> &key : totalKeys) {
+        names.append(QStringLiteral("{%1:...}").arg(QLatin1StringView(key.key)));
+    }
+    for (const char *name : {"{lengthUnit}", "{areaUnit}", "{angleUnit}"}) {
         names.append(QLatin1StringView(name));
     }
     return names;
@@ -69,10 +72,10 @@ std::optional<Piece> placeholderOf(const QString &name, const JsonPath &path, co
         return textPiece(*unit);
     }
     const QString kind = name.section(u':', 0, 0);
-    for (const char *known : {"sum", "mean", "min", "max", "count"}) {
-        if (name.contains(u':') && kind == QLatin1StringView(known)) {
+    for (const ShapeKey<TotalKind> &known : totalKeys) {
+        if (name.contains(u':') && kind == QLatin1StringView(known.key)) {
             piece.kind = Piece::Kind::Total;
-            piece.total = indexOf(kind, {name.section(u':', 1), path});
+            piece.total = indexOf(known.kind, {name.section(u':', 1), path});
             return piece;
         }
     }

@@ -11,7 +11,7 @@ namespace kareport
 {
 
 /// Gives a total of a variable its index in the totals of the table.
-using TotalIndex = std::function<TotalCell(const QString &kind, const TableShape::Name &variable)>;
+using TotalIndex = std::function<TotalCell(TotalKind kind, const TableShape::Name &variable)>;
 
 /// Reads a text with placeholders: "{count}", a total such as "{sum:Volume}", a unit such as "{areaUnit}", or a variable that
 /// groups are made by. "{{" is one "{".

@@ -163,11 +163,12 @@ void Binding::bindRunning(const TableShape::Running &running)
     using Kind = RunningValue::Kind;
     const FoundVariable result = target(running.variable);
     FoundVariable of;
+    const bool isRowNumber = running.kind == Kind::RowNumber;
     if (running.perGroup && shape_.groups.empty()) {
         lookup_.fail(running.path,
                      Xlate("\"per\": \"group\" goes with groups: the key \"groups\" was expected in the step"));
     }
-    if (running.kind != u"rowNumber") {
+    if (!isRowNumber) {
         of = lookup_.find(running.of);
         if (!lookup_.error() && (!isAdded(of.type) || equalFolded(running.of.text, running.variable.text))) {
             lookup_.fail(running.of.path,
@@ -179,18 +180,14 @@ void Binding::bindRunning(const TableShape::Running &running)
         return;
     }
     const Measure measure = measureOf(result.type);
-    const bool isLabel = running.kind == u"rowNumber" && measure == Measure::Text;
-    const bool isWholeOfOthers =
-        running.kind != u"rowNumber" && result.type == VARIABLE_INTEGER && of.type != VARIABLE_INTEGER;
-    const Measure wanted = running.kind == u"rowNumber" ? Measure::Number : measureOf(of.type);
+    const bool isLabel = isRowNumber && measure == Measure::Text;
+    const bool isWholeOfOthers = !isRowNumber && result.type == VARIABLE_INTEGER && of.type != VARIABLE_INTEGER;
+    const Measure wanted = isRowNumber ? Measure::Number : measureOf(of.type);
     if (isWholeOfOthers || (!isLabel && measure != wanted)) {
         lookup_.fail(running.variable.path, noFit(result));
         return;
     }
-    const Kind kind = running.kind == u"sum"          ? Kind::Sum
-                      : running.kind == u"difference" ? Kind::Difference
-                                                      : Kind::RowNumber;
-    bound_.rows.running.emplace_back(kind, of.id, of.reader, RunningValue::Target{result.id, result.type},
+    bound_.rows.running.emplace_back(running.kind, of.id, of.reader, RunningValue::Target{result.id, result.type},
                                      running.perGroup);
 }
 

@@ -1,6 +1,10 @@
 #pragma once
 
 #include "JsonPlaces.h"
+#include "RowConditions.h"
+#include "RowFormulas.h"
+#include "RunningValues.h"
+#include "TableGroups.h"
 
 #include <QJsonValue>
 #include <QString>
@@ -30,22 +34,22 @@ struct TableShape
     struct Condition
     {
         Name of;
-        QString kind; ///< the key: "is", "isNot", "above", "below", "outside" or "exists"
+        RowCondition::Kind kind = RowCondition::Kind::Exists;
         std::vector<Value> values;
         std::optional<Name> beside;
     };
     struct Formula
     {
         Name variable;
-        QString kind; ///< the key: "sum", "difference", "product", "distance" or "bearing"
+        RowFormula::Kind kind = RowFormula::Kind::Sum;
         std::vector<Name> operands;
         JsonPath path;
     };
     struct Running
     {
         Name variable;
-        QString kind; ///< the key: "sum", "difference" or "rowNumber"
-        Name of;      ///< empty for "rowNumber"
+        RunningValue::Kind kind = RunningValue::Kind::RowNumber;
+        Name of; ///< empty for a row number
         bool perGroup = false;
         JsonPath path;
     };
@@ -58,7 +62,7 @@ struct TableShape
     };
     struct Total
     {
-        QString kind; ///< the key: "sum", "mean", "min", "max" or "count"
+        TotalKind kind = TotalKind::Sum;
         Name variable;
     };
     struct TotalLine
@@ -84,13 +88,14 @@ struct TableShape
     std::vector<Group> groups;
     std::vector<TotalLine> totals;
     std::vector<TotalLine> pageTotals;
-    bool addsPrinted = false;
+    bool addsPrinted = false;         ///< whether the digits that are printed are added
+    std::optional<JsonPath> rounding; ///< where the step says what is added
 
     /// Whether the step asks for nothing of it.
     bool isEmpty() const
     {
         return sort.empty() && where.empty() && compute.empty() && running.empty() && flags.empty() && groups.empty() &&
-               totals.empty() && pageTotals.empty();
+               totals.empty() && pageTotals.empty() && !rounding;
     }
 };
 

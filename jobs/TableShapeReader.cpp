@@ -1,6 +1,7 @@
 #include "TableShapeReader.h"
 
 #include "NearestName.h"
+#include "ShapeKeys.h"
 #include "Xlate.h"
 
 #include <algorithm>
@@ -68,44 +69,59 @@ void forEach(const JsonNode &list, const std::function<void(const JsonNode &)> &
     }
 }
 
-/// The one of some keys that an object has. More or none of them is an error.
-QString readKind(const JsonNode &node, const QStringList &kinds)
+template <typename Kind, std::size_t count>
+QStringList namesOf(const ShapeKey<Kind> (&keys)[count])
 {
-    QString found;
-    for (const QString &kind : kinds) {
-        if (!node[kind].exists()) {
+    QStringList names;
+    for (const ShapeKey<Kind> &key : keys) {
+        names.append(QLatin1StringView(key.key));
+    }
+    return names;
+}
+
+/// The one of some keys that an object has. More or none of them is an error; what comes back then is not used.
+template <typename Kind, std::size_t count>
+ShapeKey<Kind> readKind(const JsonNode &node, const ShapeKey<Kind> (&keys)[count])
+{
+    const QString expected = namesOf(keys).join(QStringLiteral(", "));
+    const ShapeKey<Kind> *found = nullptr;
+    for (const ShapeKey<Kind> &key : keys) {
+        const JsonNode one = node[QLatin1StringView(key.key)];
+        if (!one.exists()) {
             continue;
         }
-        if (!found.isEmpty()) {
-            node[kind].fail(Xlate("one of %1 was expected, not two").arg(kinds.join(QStringLiteral(", "))));
+        if (found != nullptr) {
+            one.fail(Xlate("one of %1 was expected, not two").arg(expected));
         }
-        found = kind;
+        found = &key;
     }
-    if (found.isEmpty()) {
-        node.fail(Xlate("one of %1 was expected").arg(kinds.join(QStringLiteral(", "))));
+    if (found == nullptr) {
+        node.fail(Xlate("one of %1 was expected").arg(expected));
     }
-    return found;
+    return found != nullptr ? *found : keys[0];
 }
 
 TableShape::Condition readCondition(const JsonNode &node, const QStringList &others)
 {
-    const QStringList kinds = texts({"is", "isNot", "above", "below", "outside", "exists"});
-    node.allowOnly(others + texts({"of", "beside"}) + kinds);
+    using Kind = RowCondition::Kind;
+    node.allowOnly(others + texts({"of", "beside"}) + namesOf(conditionKeys));
     TableShape::Condition condition;
     condition.of = readVariable(node[QStringLiteral("of")]);
-    condition.kind = readKind(node, kinds);
-    const JsonNode value = node[condition.kind];
-    const bool isList = condition.kind.startsWith(u"is") && value.value().isArray();
+    const auto [key, kind] = readKind(node, conditionKeys);
+    condition.kind = kind;
+    const JsonNode value = node[QLatin1StringView(key)];
+    const bool isOfValues = kind == Kind::Is || kind == Kind::IsNot;
+    const bool isList = isOfValues && value.value().isArray();
     for (qsizetype i = 0; i < (isList ? value.size() : 1); ++i) {
         const JsonNode one = isList ? value[i] : value;
         condition.values.push_back({one.value(), one.path()});
     }
-    if (condition.kind == u"exists") {
-        value.boolean(true);
+    if (kind == Kind::Exists && !value.boolean(true)) {
+        condition.kind = Kind::Missing;
     }
     if (const JsonNode beside = node[QStringLiteral("beside")]; beside.exists()) {
         condition.beside = readName(beside);
-        if (condition.kind.startsWith(u"is") || condition.kind == u"exists") {
+        if (isOfValues || kind == Kind::Exists) {
             beside.fail(Xlate("\"beside\" was expected only with above, below or outside"));
         }
     }
@@ -114,26 +130,27 @@ TableShape::Condition readCondition(const JsonNode &node, const QStringList &oth
 
 TableShape::Formula readFormula(const JsonNode &node)
 {
-    const QStringList kinds = texts({"sum", "difference", "product", "distance", "bearing"});
-    node.allowOnly(texts({"variable"}) + kinds);
+    using Kind = RowFormula::Kind;
+    node.allowOnly(texts({"variable"}) + namesOf(formulaKeys));
     TableShape::Formula formula;
     formula.variable = readVariable(node[QStringLiteral("variable")]);
-    formula.kind = readKind(node, kinds);
+    const auto [key, kind] = readKind(node, formulaKeys);
+    formula.kind = kind;
     formula.path = node.path();
-    const JsonNode operands = node[formula.kind];
+    const JsonNode operands = node[QLatin1StringView(key)];
     if (!operands.expectArray()) {
         return formula;
     }
     formula.operands = readNames(operands);
     const std::size_t count = formula.operands.size();
-    if ((formula.kind == u"difference" || formula.kind == u"product") && count != 2) {
+    if ((kind == Kind::Difference || kind == Kind::Product) && count != 2) {
         operands.fail(Xlate("two variables were expected"));
-    } else if (formula.kind == u"sum" && count < 2) {
+    } else if (kind == Kind::Sum && count < 2) {
         operands.fail(Xlate("two variables or more were expected"));
-    } else if (formula.kind == u"distance" && count != 4 && count != 6) {
+    } else if (kind == Kind::Distance && count != 4 && count != 6) {
         operands.fail(Xlate("the northing and easting, or the northing, easting and elevation, of two points were "
                             "expected"));
-    } else if (formula.kind == u"bearing" && count != 4) {
+    } else if (kind == Kind::Bearing && count != 4) {
         operands.fail(Xlate("the northing and easting of two points were expected"));
     }
     return formula;
@@ -141,14 +158,14 @@ TableShape::Formula readFormula(const JsonNode &node)
 
 TableShape::Running readRunning(const JsonNode &node)
 {
-    const QStringList kinds = texts({"sum", "difference", "rowNumber"});
-    node.allowOnly(texts({"variable", "per"}) + kinds);
+    node.allowOnly(texts({"variable", "per"}) + namesOf(runningKeys));
     TableShape::Running running;
     running.variable = readVariable(node[QStringLiteral("variable")]);
-    running.kind = readKind(node, kinds);
+    const auto [key, kind] = readKind(node, runningKeys);
+    running.kind = kind;
     running.path = node.path();
-    const JsonNode value = node[running.kind];
-    if (running.kind == u"rowNumber") {
+    const JsonNode value = node[QLatin1StringView(key)];
+    if (kind == RunningValue::Kind::RowNumber) {
         if (!value.boolean(true)) {
             value.fail(Xlate("true was expected"));
         }
@@ -178,22 +195,23 @@ TableShape::Flag readFlag(const JsonNode &node)
 
 std::vector<TableShape::TotalLine> readTotals(const JsonNode &list)
 {
-    const QStringList kinds = texts({"sum", "mean", "min", "max", "count"});
+    const QStringList expected = texts({"label"}) + namesOf(totalKeys);
     std::vector<TableShape::TotalLine> lines;
     forEach(list, [&](const JsonNode &node) {
-        node.allowOnly(texts({"label"}) + kinds);
+        node.allowOnly(expected);
         TableShape::TotalLine line;
         line.label = readName(node[QStringLiteral("label")]);
-        for (const QString &kind : kinds) {
-            if (!node[kind].exists()) {
+        for (const ShapeKey<TotalKind> &key : totalKeys) {
+            const JsonNode named = node[QLatin1StringView(key.key)];
+            if (!named.exists()) {
                 continue;
             }
-            for (const TableShape::Name &name : readNames(node[kind])) {
-                line.totals.push_back({kind, name});
+            for (const TableShape::Name &name : readNames(named)) {
+                line.totals.push_back({key.kind, name});
             }
         }
         if (line.totals.empty() && line.label.text.isEmpty()) {
-            node.fail(Xlate("one of %1 was expected").arg((texts({"label"}) + kinds).join(QStringLiteral(", "))));
+            node.fail(Xlate("one of %1 was expected").arg(expected.join(QStringLiteral(", "))));
         }
         lines.push_back(std::move(line));
     });
@@ -242,6 +260,7 @@ TableShape readTableShape(const JsonNode &step)
     shape.totals = readTotals(step[QStringLiteral("totals")]);
     shape.pageTotals = readTotals(step[QStringLiteral("pageTotals")]);
     if (const JsonNode rounding = step[QStringLiteral("rounding")]; rounding.exists()) {
+        shape.rounding = rounding.path();
         shape.addsPrinted = rounding.text() == u"printed";
         if (!shape.addsPrinted && rounding.text() != u"exact") {
             rounding.fail(oneOfExpected(rounding.text(), texts({"exact", "printed"})));

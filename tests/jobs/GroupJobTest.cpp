@@ -88,6 +88,24 @@ TEST(GroupJob, NestsGroups)
         << "a layer of the same name in another site is another group";
 }
 
+TEST(GroupJob, BlankLinesAreBetweenGroups)
+{
+    TestJob test;
+    const QString text =
+        run(test, R"("table": "Sorted", "data": "v", "groups": [{"by": "Layer", "heading": "{Layer}", "before": 2}])");
+    EXPECT_EQ(text.toStdString(), "-\n"
+                                  "Layer |Pt  |   Volume|    Area\n\n"
+                                  "A\n"
+                                  "A     |1   |    0.100|   1.000\n"
+                                  "A     |2   |    0.200|   2.000\n"
+                                  "A     |5   |    0.300|   3.000\n"
+                                  "\n\n"
+                                  "B\n"
+                                  "B     |3   |    2.000|   4.000\n"
+                                  "b     |4   |    1.000|   5.000\n")
+        << "not under the heading of the table";
+}
+
 TEST(GroupJob, ShowsTheRowsThatFulfilConditions)
 {
     const struct
@@ -191,6 +209,36 @@ TEST(GroupJob, AddsWhatIsPrintedWhereItIsAskedTo)
     EXPECT_TRUE(printed.trimmed().section(u'\n', -1).contains(u"0.002")) << printed.toStdString();
 }
 
+TEST(GroupJob, BetweenTabsTotalsAreInTheirColumns)
+{
+    const QByteArray step =
+        R"({"line": "-"}, {"table": "Sorted", "data": "v", "groups": [{"by": "Layer", "heading": "Layer {Layer}",
+        "totals": [{"label": "{count} points", "sum": ["Volume", "Area"]}, {"label": "Layers", "count": "Layer"}]}],
+        "totals": [{"label": "Mean", "mean": "Area"}]})";
+    for (const bool isForm : {false, true}) { // of the template's separator, or of the option
+        TestJob test;
+        test.folder.put("t.xml", jobs::layersTemplate(isForm ? "124" : "9"));
+        test.run(jobs::templateJob(fiveRows, step, isForm ? R"("options": {"excel": true}, )" : ""));
+        EXPECT_EQ(test.text().toStdString(), "-\n"
+                                             "Layer\tPt\tVolume\tArea\n\n"
+                                             "Layer A\n"
+                                             "A\t1\t0.100\t1.000\n"
+                                             "A\t2\t0.200\t2.000\n"
+                                             "A\t5\t0.300\t3.000\n"
+                                             "3 points\t\t0.600\t6.000\n"
+                                             "Layers\n"
+                                             "3\t\t\t\n"
+                                             "Layer B\n"
+                                             "B\t3\t2.000\t4.000\n"
+                                             "b\t4\t1.000\t5.000\n"
+                                             "2 points\t\t3.000\t9.000\n"
+                                             "Layers\n"
+                                             "2\t\t\t\n"
+                                             "Mean\t\t\t3.000\n")
+            << isForm;
+    }
+}
+
 TEST(GroupJob, LeavesJobsAloneThatDoNotAsk)
 {
     TestJob test;
@@ -199,7 +247,7 @@ TEST(GroupJob, LeavesJobsAloneThatDoNotAsk)
     EXPECT_EQ(run(grouped, R"("table": "Sorted", "data": "v", "groups": [{"by": "Layer"}])"), plain)
         << "groups without heading and totals show nothing";
     TestJob exact;
-    EXPECT_EQ(run(exact, R"("table": "Sorted", "data": "v", "rounding": "exact", "totals": [], "where": [])"), plain);
+    EXPECT_EQ(run(exact, R"("table": "Sorted", "data": "v", "totals": [], "pageTotals": [], "where": [])"), plain);
 }
 
 TEST(GroupJob, SaysWhatIsInNoTotal)
