@@ -1,5 +1,6 @@
 #include "CellDecimal.h"
 
+#include <algorithm>
 #include <array>
 #include <charconv>
 #include <cmath>
@@ -161,11 +162,13 @@ CellDecimal CellReader::readNumber(double value, double quotient)
 {
     const CellDecimal number = factor_ == 1 ? shortest(value) : safeDigits(quotient);
     if (number.toDouble() * factor_ == value) {
-        const int decimals = -number.exponent;
-        const bool isSafe = static_cast<double>(std::llabs(number.digits)) < mostQuick;
-        if (isSafe && decimals > decimals_ && decimals <= mostDecimals()) {
-            decimals_ = decimals;
-            power_ = exactPowers[static_cast<std::size_t>(decimals)];
+        // A number that has fewer decimals is here because it has too many digits with those of the ones before.
+        const int decimals = std::max(-number.exponent, 0);
+        if (decimals != decimals_ && decimals <= mostDecimals()) {
+            const double power = exactPowers[static_cast<std::size_t>(decimals)];
+            const bool isSafe = std::fabs(quotient) * power < mostQuick;
+            decimals_ = isSafe ? decimals : decimals_;
+            power_ = isSafe ? power : power_;
         }
         return number;
     }

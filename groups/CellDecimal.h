@@ -34,16 +34,25 @@ public:
     /// @param value  internal and finite @return what it is counted as
     CellDecimal read(double value)
     {
+        CellDecimal number;
+        return readQuickly(value, number) ? number : readSlowly(value);
+    }
+    /// Reads a value that has no more decimals than values had lately, and not too many digits with so many.
+    /// @return whether it is one
+    bool readQuickly(double value, CellDecimal &number) const
+    {
         const double power = power_;
         const double scaled = (factor_ == 1 ? value : value / factor_) * power;
-        if (scaled > -mostQuick && scaled < mostQuick) {
-            const auto digits = static_cast<qint64>(scaled < 0 ? scaled - 0.5 : scaled + 0.5);
-            // Digits and power are exact in a double, so that the quotient is what reading their text gives.
-            if (static_cast<double>(digits) / power * factor_ == value) {
-                return counted({digits, -decimals_});
-            }
+        if (!(scaled > -mostQuick && scaled < mostQuick)) {
+            return false;
         }
-        return readSlowly(value);
+        const auto digits = static_cast<qint64>(scaled < 0 ? scaled - 0.5 : scaled + 0.5);
+        // Digits and power are exact in a double, so that the quotient is what reading their text gives.
+        if (static_cast<double>(digits) / power * factor_ != value) {
+            return false;
+        }
+        number = counted({digits, -decimals_});
+        return true;
     }
     /// The internal value of a number as it is counted.
     double internal(double number) const { return number / perUnit_ * factor_; }

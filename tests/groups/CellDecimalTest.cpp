@@ -79,6 +79,22 @@ TEST(CellReader, GivesEveryNumberOfFifteenDigitsBack)
     }
 }
 
+TEST(CellReader, GetsUsedToTheDecimalsOfTheNumbers)
+{
+    CellReader reader;
+    CellDecimal number;
+    EXPECT_FALSE(reader.readQuickly(0.123456789, number)) << "more decimals than it begins with";
+    reader.read(0.123456789);
+    EXPECT_TRUE(reader.readQuickly(0.987654321, number));
+    EXPECT_EQ(shown(number), "987654321e-9");
+    EXPECT_FALSE(reader.readQuickly(1234567890.125, number)) << "too many digits with nine decimals";
+    EXPECT_EQ(shown(reader.read(1234567890.125)), "1234567890125e-3");
+    EXPECT_TRUE(reader.readQuickly(-1234567891.5, number));
+    EXPECT_EQ(shown(number), "-12345678915e-1");
+    reader.read(1e20);
+    EXPECT_TRUE(reader.readQuickly(12.345, number)) << "a number that is never read quickly changes nothing";
+}
+
 TEST(CellReader, CountsDegreesInSeconds)
 {
     constexpr double degree = std::numbers::pi / 180;
