@@ -23,6 +23,7 @@ p{margin:.4rem 0;white-space:pre-wrap}
 nav a{margin-right:1rem}
 table{border-collapse:collapse;margin:1rem 0}
 th,td{border-bottom:1px solid var(--line);padding:.2rem .7rem;text-align:left;vertical-align:top;white-space:pre-wrap}
+caption{font-weight:bold;padding:.2rem .7rem;text-align:left}
 thead th{background:var(--band);border-bottom:2px solid var(--line);position:sticky;top:0;vertical-align:bottom}
 .n,.r{text-align:right}
 .c{text-align:center}
@@ -40,7 +41,7 @@ nav{display:none}
 thead{display:table-header-group}
 thead th{position:static}
 tr{break-inside:avoid}
-h2,tr.g{break-after:avoid}
+h2,caption,tr.g{break-after:avoid}
 tbody.t{break-before:avoid}
 th[aria-sort] span::after{content:""}
 }

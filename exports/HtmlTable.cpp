@@ -81,7 +81,7 @@ void HtmlResult::openTable()
         return;
     }
     isHeadPending_ = false;
-    out() += "<table class=\"data\" aria-label=\"" + label_ + "\">\n<thead>\n<tr>";
+    out() += "<table class=\"data\">\n<caption>" + label_ + "</caption>\n<thead>\n<tr>";
     for (const Column &column : columns_) {
         out() += "<th scope=\"col\"" + column.opening;
         out() += column.hasSortValue && !column.isNumber ? " data-v><span>" : "><span>";

@@ -77,7 +77,8 @@ bool XlsxResult::beginTable(const ResultTable &table)
         if (!table.columns[i].isShown) {
             continue;
         }
-        if (isTable_ && columns_.size() + 2 > LXW_COL_MAX) {
+        const bool hasValue = table.columns[i].field.Type == VARIABLE_BEARING && options_.bearingValues;
+        if (isTable_ && columns_.size() + (hasValue ? 2 : 1) > LXW_COL_MAX) {
             ++columnsLeftOut_;
         } else {
             addColumn(table.columns[i], i);

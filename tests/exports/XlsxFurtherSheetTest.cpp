@@ -71,6 +71,39 @@ TEST(XlsxFurtherSheet, BlocksGoOnInIt)
     EXPECT_EQ(sheetsOf(result), 2);
 }
 
+TEST(XlsxFurtherSheet, ColumnsBeyondItsLastOneAreLeftOut)
+{
+    struct Row
+    {
+        std::size_t columns;
+        bool endsWithBearing;
+        const char *warning;
+        const char *reason;
+    };
+    const Row rows[] = {
+        {16'384, false, "", "as many as a sheet has"},
+        {16'385, false, "1 columns are more than a sheet of a workbook holds, and are left out", "one more"},
+        {16'383, true, "", "a bearing with the column of its degrees"},
+        {16'384, true, "1 columns are more than a sheet of a workbook holds, and are left out",
+         "there is no room for the degrees of the last one"},
+    };
+    const UJobSettings settings;
+    for (const Row &row : rows) {
+        kareport::ResultOptions options;
+        options.bearingValues = true;
+        kareport::XlsxResult result(options);
+        kareport::ResultTable table = countTable(settings, true);
+        table.columns.resize(row.columns, table.columns.front());
+        if (row.endsWithBearing) {
+            table.columns.back().field.Type = VARIABLE_BEARING;
+        }
+        ASSERT_TRUE(result.beginTable(table));
+        result.endTable();
+        EXPECT_TRUE(result.finish()) << result.problem().toStdString();
+        EXPECT_EQ(result.warnings().join(u'\n').toStdString(), row.warning) << row.reason;
+    }
+}
+
 TEST(XlsxFurtherSheet, TablesGoOnInIt)
 {
     const UJobSettings settings;

@@ -41,7 +41,8 @@ TEST(HtmlResult, TheReportIsOnePage)
 <p class="made">TALVEN, <time datetime="2024-03-05T14:07:00">2024-03-05 14:07</time></p>
 <h2>Setting out</h2>
 <p><b><u>x &lt; y</u></b></p>
-<table class="data" aria-label="Points">
+<table class="data">
+<caption>Points</caption>
 <thead>
 <tr><th scope="col"><span>Pt</span></th><th scope="col" class="n"><span>North</span></th></tr>
 </thead>
@@ -117,6 +118,7 @@ TEST(HtmlResult, ALongTableGoesOnInFurtherPages)
     EXPECT_EQ(count(all, "<table"), 3);
     EXPECT_EQ(count(all, "</table>"), 3);
     EXPECT_EQ(count(all, "<thead>"), 3) << "under its heading again";
+    EXPECT_EQ(count(all, "<caption>Points</caption>"), 3);
     EXPECT_EQ(count(all, "<h1>T</h1>"), 3);
     EXPECT_EQ(count(all, "the end"), 1);
     EXPECT_THAT(all, HasSubstr(R"(<a rel="next" href="a%20b-2.html">2 &rarr;</a>)"));

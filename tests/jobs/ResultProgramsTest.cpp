@@ -114,6 +114,16 @@ protected:
                                     QStringLiteral("--user-data-dir=") + job_.folder.path("profile")} +
                             arguments + QStringList{page});
     }
+    /// Opens a page with a script of the test in it.
+    Outcome runScript(std::string page, const std::string &script) const
+    {
+        // The page's own rules let no other script in: they are told of this one, and hold for the page's own.
+        const QByteArray hash = QCryptographicHash::hash(QByteArray::fromStdString(script), QCryptographicHash::Sha256);
+        page.insert(page.find("script-src ") + 11, "'sha256-" + hash.toBase64().toStdString() + "' ");
+        page.insert(page.find("</body>"), "<script>" + script + "</script>");
+        putPage(page);
+        return browse({QStringLiteral("--dump-dom")});
+    }
     void putPage(const std::string &page) const { job_.folder.put("p.html", QByteArray::fromStdString(page)); }
 
     ResultJob job_;
@@ -133,15 +143,43 @@ TEST_F(HtmlBrowser, CellsAreWhatTheReportPrintsAndSortByTheirValues)
         "document.querySelectorAll('thead [role=button]')[1].dispatchEvent(new KeyboardEvent('keydown', {key: 'Enter'}));"
         "seen.push(of(0, 1), document.querySelectorAll('th')[1].getAttribute('aria-sort'));"
         "document.title = seen.join('|');";
-    // The page's own rules let no other script in: they are told of this one, and hold for the page's own.
-    const QByteArray hash = QCryptographicHash::hash(QByteArray::fromStdString(script), QCryptographicHash::Sha256);
-    std::string page = page_;
-    page.insert(page.find("script-src ") + 11, "'sha256-" + hash.toBase64().toStdString() + "' ");
-    page.insert(page.find("</body>"), "<script>" + script + "</script>");
-    putPage(page);
-    const Outcome run = browse({QStringLiteral("--dump-dom")});
+    const Outcome run = runScript(page_, script);
     EXPECT_THAT(run.out.toStdString(),
                 HasSubstr("<title>300|&lt;i&gt;0|119.000|0.000|299.000|299.000|descending</title>"));
+}
+
+TEST_F(HtmlBrowser, TotalsStayUnderTheirGroups)
+{
+    job_.run(jobs::templateJob(R"("p": {"values": [{"Number": "1", "Northing": 1}, {"Number": "2", "Northing": 5},
+        {"Number": "1", "Northing": 3}, {"Number": "2", "Northing": 9}]})",
+                               R"({"table": "Points", "data": "p", "sort": "Number", "groups": [{"by": "Number",
+        "heading": "Point {Number}", "totals": [{"label": "{count} rows", "sum": "Northing"}]}],
+        "totals": [{"label": "All", "sum": "Northing"}]})") +
+             R"(, "output": ["p.html"])");
+    ASSERT_EQ(job_.error.toStdString(), "");
+    const std::string script =
+        "const label = document.querySelectorAll('thead [role=button]')[1];"
+        "label.click(); label.click();"
+        "document.title = document.querySelector('caption').textContent + '|' + [...document.querySelectorAll('tbody tr')]"
+        ".map(row => [...row.cells].map(cell => cell.textContent.trim()).join(' ')).join('|');";
+    const Outcome run = runScript(job_.bytes("p.html"), script);
+    EXPECT_THAT(run.out.toStdString(),
+                HasSubstr("<title>Points|Point 1|1 3.000|1 1.000|2 rows 4.000|Point 2|2 9.000|2 5.000|2 rows 14.000|"
+                          "All 18.000</title>"));
+}
+
+TEST_F(HtmlBrowser, InfiniteNumbersAreTheGreatestAndTheLeast)
+{
+    job_.run(jobs::templateJob(R"("p": {"values": [{"Number": "1", "Northing": 5}, {"Number": "2", "Northing": "INF"},
+        {"Number": "3", "Northing": -3}, {"Number": "4", "Northing": "-INF"}]})",
+                               R"({"table": "Points", "data": "p"})") +
+             R"(, "output": ["p.html"])");
+    ASSERT_EQ(job_.error.toStdString(), "");
+    const std::string script =
+        "document.querySelectorAll('thead [role=button]')[1].click();"
+        "document.title = [...document.querySelectorAll('tbody tr')].map(row => row.cells[0].textContent).join('');";
+    const Outcome run = runScript(job_.bytes("p.html"), script);
+    EXPECT_THAT(run.out.toStdString(), HasSubstr("<title>4312</title>"));
 }
 
 TEST_F(HtmlBrowser, ItsOwnRulesLetItsOwnScriptRun)

@@ -43,6 +43,8 @@ TEST(XlsxGroups, HeadingsAndTotalsAreRows)
     EXPECT_THAT(book.cells(0), HasSubstr("A15 s Total\nC15 n 3.6 0.000\nD15 n 15 0.000\n"));
     EXPECT_EQ(book.of(0, "frozen"), QStringLiteral("A2"));
     EXPECT_EQ(book.of(0, "filter"), QStringLiteral("A1:D11")) << "without the totals after the last row";
+    EXPECT_EQ(book.of(0, "widths"), QStringLiteral("8 6 11 10")) << "of the fields, with room beside them";
+    EXPECT_EQ(book.of(0, "repeated"), QStringLiteral("Sorted!$1:$1")) << "on every sheet of paper";
 }
 
 TEST(XlsxGroups, TotalsAreFormulasWhereTheyAreAskedFor)

@@ -3,8 +3,9 @@
 
     workbook.py FILE
 
-Only what Python itself brings is used. A sheet is {"name", "frozen", "filter", "cells"}; a cell is [place, type, value,
-format] with the types n (number) and s (text).
+Only what Python itself brings is used. A sheet is {"name", "frozen", "filter", "widths", "repeated", "cells"}: the widths of
+the columns in characters, and the rows that every sheet of paper has. A cell is [place, type, value, format] with the types
+n (number), s (text) and f (formula).
 """
 import json
 import re
@@ -28,7 +29,7 @@ def formats(book):
     return [codes.get(int(each.get("numFmtId")), each.get("numFmtId")) for each in styles.find(main + "cellXfs")]
 
 
-def sheet(book, number, name, codes):
+def sheet(book, number, name, codes, repeated):
     root = xml.fromstring(book.read(f"xl/worksheets/sheet{number}.xml"))
     cells = []
     for cell in root.iter(main + "c"):
@@ -46,14 +47,20 @@ def sheet(book, number, name, codes):
     pane = root.find(f".//{main}pane")
     filtered = root.find(main + "autoFilter")
     return {"name": name, "frozen": pane.get("topLeftCell") if pane is not None else None,
-            "filter": filtered.get("ref") if filtered is not None else None, "cells": cells}
+            "filter": filtered.get("ref") if filtered is not None else None,
+            "widths": " ".join(str(int(float(each.get("width")))) for each in root.iter(main + "col")
+                               for _ in range(int(each.get("min")), int(each.get("max")) + 1)),
+            "repeated": repeated.get(str(number - 1), ""), "cells": cells}
 
 
 with zipfile.ZipFile(sys.argv[1]) as book:
     assert book.testzip() is None
-    names = [each.get("name") for each in xml.fromstring(book.read("xl/workbook.xml")).iter(main + "sheet")]
+    root = xml.fromstring(book.read("xl/workbook.xml"))
+    names = [each.get("name") for each in root.iter(main + "sheet")]
+    repeated = {each.get("localSheetId"): each.text for each in root.iter(main + "definedName")
+                if each.get("name") == "_xlnm.Print_Titles"}
     codes = formats(book)
     core = xml.fromstring(book.read("docProps/core.xml"))
     properties = {each.tag.rsplit("}")[-1]: each.text for each in core}
     json.dump({"properties": properties,
-               "sheets": [sheet(book, i + 1, name, codes) for i, name in enumerate(names)]}, sys.stdout)
+               "sheets": [sheet(book, i + 1, name, codes, repeated) for i, name in enumerate(names)]}, sys.stdout)
