@@ -83,6 +83,9 @@ HPDF_FontDef KeptDocument::definitionOf(const PdfFace &face)
 
 HPDF_FontDef KeptDocument::readFace(const PdfFace &face)
 {
+    if (!face.isFont()) {
+        return nullptr; // the library takes the first bytes of any file for sizes
+    }
     faces_.reserve(faces_.size() + 1); // nothing fails once the library has it
     const QFileInfo file(face.file());
     Face read = {face.file(), face.index(), face.isCollection(), file.lastModified(), file.size(), nullptr};

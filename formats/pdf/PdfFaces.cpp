@@ -100,6 +100,11 @@ PdfFace::PdfFace(QString file, unsigned index, bool isCollection, std::shared_pt
     : file_(std::move(file)), index_(index), isCollection_(isCollection), coverage_(std::move(coverage))
 {}
 
+bool PdfFace::isFont() const
+{
+    return coverage_->characters != nullptr;
+}
+
 bool PdfFace::covers(char32_t character) const
 {
     return character <= 0xFFFF && coverage_->characters != nullptr &&

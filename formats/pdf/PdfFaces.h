@@ -23,6 +23,8 @@ public:
     const QString &file() const { return file_; }
     unsigned index() const { return index_; } ///< of the face in a collection, from 0
     bool isCollection() const { return isCollection_; }
+    /// Whether the file is a font, as far as its face was found in it.
+    bool isFont() const;
     /// Whether the face has a glyph that a PDF can show: nothing beyond U+FFFF is.
     bool covers(char32_t character) const;
 
