@@ -17,8 +17,8 @@ namespace kareport
 namespace
 {
 
-constexpr qsizetype mostCharacters = 32'767; ///< of a cell
-constexpr qsizetype escapeLength = 7;        ///< of _x0041_
+constexpr qsizetype longestCell = 32'767; ///< of a cell
+constexpr qsizetype escapeLength = 7;     ///< of _x0041_
 
 /// Whether a text has an escape of the file format at a position, such as _x0041_.
 bool isEscape(QStringView text, qsizetype at)
@@ -136,7 +136,7 @@ void XlsxBook::writeText(lxw_worksheet *sheet, lxw_row_t row, lxw_col_t column, 
 {
     text_.clear();
     const PlainNumbers plain; // with the first cell of a row, the library writes the row before it
-    cutTexts_ += appendSheetText(text_, text, mostCharacters) < text.size() ? 1U : 0U;
+    cutTexts_ += appendSheetText(text_, text, longestCell) < text.size() ? 1U : 0U;
     worksheet_write_string(sheet, row, column, text_.c_str(), format);
 }
 
