@@ -6,7 +6,9 @@
 #include "VariableType.h"
 
 #include <algorithm>
+#include <cmath>
 #include <utility>
+#include <variant>
 
 // The tables and blocks of a web page.
 
@@ -32,6 +34,13 @@ qsizetype tailOf(QStringView text)
         ++letters;
     }
     return letters;
+}
+
+/// What a number that the report does not show is sorted by, where it is infinite.
+const char *sortValueOfBlank(const ResultCell &cell)
+{
+    const double *const number = cell.value != nullptr ? std::get_if<double>(&cell.value->value()) : nullptr;
+    return number == nullptr || !std::isinf(*number) ? "" : *number < 0 ? " data-v=\"-inf\"" : " data-v=\"inf\"";
 }
 
 } // namespace
@@ -202,6 +211,8 @@ void HtmlResult::writeCells(const ResultRow &row)
                 appendNumber(out(), *number, false);
                 out() += '"';
             }
+        } else if (column.isNumber && cell.text.isEmpty()) {
+            out() += sortValueOfBlank(cell);
         }
         out() += '>';
         appendHtmlText(out(), cell.text);
