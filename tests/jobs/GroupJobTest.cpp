@@ -218,7 +218,7 @@ TEST(GroupJob, BetweenTabsTotalsAreInTheirColumns)
     for (const bool isForm : {false, true}) { // of the template's separator, or of the option
         TestJob test;
         test.folder.put("t.xml", jobs::layersTemplate(isForm ? "124" : "9"));
-        test.run(jobs::templateJob(fiveRows, step, isForm ? R"("options": {"excel": true}, )" : ""));
+        test.run(jobs::templateJob(jobs::fiveRows, step, isForm ? R"("options": {"excel": true}, )" : ""));
         EXPECT_EQ(test.text().toStdString(), "-\n"
                                              "Layer\tPt\tVolume\tArea\n\n"
                                              "Layer A\n"
