@@ -1,12 +1,10 @@
 #include "ImportGuess.h"
 
-#include "ColumnChoices.h"
 #include "CsvOptions.h"
 #include "CsvPreview.h"
 #include "CsvRows.h"
 #include "DelimiterGuess.h"
 #include "JobSettings.h"
-#include "SqlitePreview.h"
 #include "TextEncoding.h"
 #include "TextFolding.h"
 
@@ -250,43 +248,6 @@ DataPreview previewTextFile(const std::shared_ptr<const FileBytes> &begin, const
         return preview;
     }
     return previewCsv(begin, dialect, variablesIn(units), mostRowsShown);
-}
-
-DataPreview previewDatabase(const QString &file, const QJsonObject &options,
-                            const std::function<Variables(const DataUnits &)> &variablesIn, int mostRowsShown)
-{
-    const JsonSource source = JsonSource::fromObject(options);
-    std::optional<InputError> error;
-    const JsonNode set(source, error);
-    SqliteQuery query;
-    query.file = file;
-    query.table = readWholeText(set[QStringLiteral("table")]);
-    query.columns = readColumnChoices(set[QStringLiteral("columns")]);
-    const DataUnits units = readDataUnits(set[QStringLiteral("units")]);
-    if (error) {
-        DataPreview preview;
-        preview.error = error;
-        return preview;
-    }
-    return previewSqlite(query, variablesIn(units), mostRowsShown);
-}
-
-QJsonObject proposedGeometry(const DataPreview &own, const Variables &variables)
-{
-    constexpr std::pair<const char *, const char *> parts[] = {
-        {"Northing", "@y"}, {"Easting", "@x"}, {"Elevation", "@z"}};
-    const auto has = [&own](const QString &name) {
-        return std::any_of(own.columns.begin(), own.columns.end(),
-                           [&name](const PreviewedColumn &column) { return equalFolded(column.name, name); });
-    };
-    QJsonObject proposed;
-    for (const auto &[variable, part] : parts) {
-        const QString name = QLatin1StringView(variable);
-        if (has(QLatin1StringView(part)) && !has(name) && variables.find(name)) {
-            proposed.insert(name, QLatin1StringView(part));
-        }
-    }
-    return proposed;
 }
 
 } // namespace kareport

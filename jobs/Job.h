@@ -140,9 +140,14 @@ struct TemplateJob
     QString templateName;
     QString table; ///< or a block
     QString block;
-    QString data;                             ///< a file, "-" for standard input
+    QString data;                             ///< a file, "-" for standard input, or a connection to a database server
     QJsonObject dataOptions = {};             ///< what else the data set says, such as its delimiter
     QString dataKind = QStringLiteral("csv"); ///< the key of the kind of data that the file holds
+
+    /// Whether the data comes from a database server, and from no file.
+    bool isOfServer() const { return dataKind == u"postgresql"; }
+    /// The file that the report is named after: that of the data or, without one, that of the template.
+    QString mainFile() const { return isOfServer() ? templateFile : data; }
 
     /// The content of the equivalent job file.
     QJsonObject toJson() const;

@@ -1,10 +1,7 @@
 #include "PostgresRows.h"
 
-#include "NearestName.h"
-#include "NumberText.h"
+#include "PostgresColumns.h"
 #include "Xlate.h"
-
-#include <algorithm>
 
 namespace kareport
 {
@@ -12,25 +9,10 @@ namespace kareport
 namespace
 {
 
-constexpr qsizetype longestQuote = 40;
-
-/// Types of numbers with decimals: single and double precision, and numeric.
-bool isNumeric(Oid type)
-{
-    return type == 700 || type == 701 || type == 1700;
-}
-
 std::string_view textOf(const PGresult *row, int column)
 {
     const LibPq &pq = libPq();
     return {pq.getvalue(row, 0, column), static_cast<std::size_t>(pq.getlength(row, 0, column))};
-}
-
-QString quoteOf(std::string_view text)
-{
-    constexpr std::size_t longestBytes = 4 * std::size_t(longestQuote) + 4; // what is cut off is not shown
-    const auto bytes = static_cast<qsizetype>(std::min(text.size(), longestBytes));
-    return shortened(QString::fromUtf8(text.data(), bytes), longestQuote);
 }
 
 } // namespace
@@ -133,18 +115,8 @@ bool PostgresRows::storeCell(const BoundField &field, const PGresult *row, int c
         binding_.storeNone(field, object);
         return true;
     }
-    const Oid type = pq_.ftype(row, column);
-    if (type == bytesType) {
-        return failInRow(Xlate("the value \"%1\" of the column \"%2\" does not fit: %3 was expected")
-                             .arg(Xlate("%1 bytes").arg((text.size() - std::min<std::size_t>(text.size(), 2)) / 2),
-                                  field.name, field.parser.expected()));
-    }
-    double number = 0;
-    return field.parser.storeValue(text, object) ||
-           // A number of the database such as 5.0 is whole, as one of JSON is.
-           (isNumeric(type) && parseNumber(text, number) && field.parser.storeNumber(number, object)) ||
-           failInRow(Xlate("the value \"%1\" of the column \"%2\" does not fit: %3 was expected")
-                         .arg(quoteOf(text), field.name, field.parser.expected()));
+    const auto wrong = storePostgresCell(field, text, pq_.ftype(row, column), object);
+    return !wrong || failInRow(*wrong);
 }
 
 /// Reads the point of the row. @return whether there is one, or no geometry at all

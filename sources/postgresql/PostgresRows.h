@@ -33,12 +33,7 @@ public:
     void stop() override { connection_->stop(); }
 
 private:
-    /// The type of a column of bytes, which has this number in every database.
-    static constexpr Oid bytesType = 17;
-
     bool prepare(const PostgresQuery &query);
-    bool findColumns(const PGresult *description);
-    std::optional<int> geometryColumnOf(const PGresult *description, const std::vector<Oid> &types);
     bool bindColumns(const PostgresQuery &query, const Variables &variables);
     void readSystems();
     bool storeRow(const PGresult *row, UDataObject &object);

@@ -1,4 +1,5 @@
 #include "PostgresObjectList.h"
+#include "PostgresPreview.h"
 #include "SurveyRows.h"
 
 #include <QTemporaryDir>
@@ -99,6 +100,21 @@ TEST_F(SilentServer, IsSaidAfterTheTimeOfTheConnection)
     const PostgresObjectList list(query(" connect_timeout=1"), survey::variables(), {});
     ASSERT_TRUE(list.error());
     EXPECT_EQ(list.error()->text.toStdString(), "the server does not answer");
+}
+
+TEST_F(SilentServer, IsNotWaitedForLongWhenTablesAreListed)
+{
+    const auto begun = std::chrono::steady_clock::now();
+    const auto late = kareport::postgresTables(query().connection, [] { return false; });
+    const auto took = std::chrono::steady_clock::now() - begun;
+    ASSERT_NE(kareport::errorOf(late), nullptr);
+    EXPECT_EQ(kareport::errorOf(late)->text.toStdString(), "the server does not answer");
+    EXPECT_LT(took, std::chrono::seconds(10));
+
+    int calls = 0;
+    const auto stopped = kareport::postgresTables(query().connection, [&calls] { return ++calls >= 3; });
+    EXPECT_NE(kareport::errorOf(stopped), nullptr);
+    EXPECT_LE(calls, 6) << "it ends at once";
 }
 
 TEST_F(SilentServer, NeedNotTakeAQuery)
