@@ -92,7 +92,7 @@ bool UReportWindowDlg::createAt(Qt::DockWidgetArea area, const QString &title, U
     dock->setWidget(body_);
     dock->setFocusProxy(body_);
     SetWindowTextW(title);
-    frame->addDockWidget(area, dock);
+    frame->DockBar(*this, area);
     ShowPane(true);
     fitHeight(*frame, *dock);
     return true;

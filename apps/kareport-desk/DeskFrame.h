@@ -61,6 +61,8 @@ public:
     void ShowHelp();
 
     void UpdateCommands() override;
+    /// Report windows that are kept are tabs of one row, wherever the first one is.
+    void DockBar(COneViewPane &pane, Qt::DockWidgetArea area) override;
 
     /// Told by the application what becomes of documents: their files are watched.
     void NoteDocumentEvent(UDocument &document, UDocument::DocumentEvent event);

@@ -114,6 +114,24 @@ void DeskFrame::newWindow()
     }
 }
 
+void DeskFrame::DockBar(COneViewPane &pane, Qt::DockWidgetArea area)
+{
+    UXTPMDIFrameWnd::DockBar(pane, area);
+    QDockWidget *last = nullptr;
+    for (QDockWidget *dock : findChildren<QDockWidget *>(QString(), Qt::FindDirectChildrenOnly)) {
+        const auto *paneDock = dynamic_cast<const kareport::PaneDock *>(dock);
+        const bool isBar = paneDock != nullptr && paneDock->pane() != nullptr && paneDock->pane() != &pane &&
+                           !paneDock->pane()->CanBeTabbedDocument();
+        // One that is still among the documents will leave them.
+        if (isBar && !dock->isHidden() && !dock->isFloating() && !paneDock->isTabbedAgainstItsWill()) {
+            last = dock;
+        }
+    }
+    if (last != nullptr) {
+        tabifyDockWidget(last, pane.GetDock());
+    }
+}
+
 void DeskFrame::dockAll(const std::function<void(QDockWidget *, QDockWidget *)> &join)
 {
     joinDocks(join);

@@ -95,8 +95,13 @@ bool PaneDock::isTabbedAgainstItsWill() const
         return true;
     }
     const auto tabs = isFloating() ? QList<QDockWidget *>() : frame->tabifiedDockWidgets(const_cast<PaneDock *>(this));
-    // A floating dock widget keeps a place in the row that it came from.
-    return std::any_of(tabs.begin(), tabs.end(), [](const QDockWidget *tab) { return !tab->isFloating(); });
+    // A floating dock widget keeps a place in the row that it came from. Panes that must not be among the documents may be
+    // tabs of a row of their own.
+    return std::any_of(tabs.begin(), tabs.end(), [](const QDockWidget *tab) {
+        const auto *other = dynamic_cast<const PaneDock *>(tab);
+        const bool isOther = other == nullptr || (other->pane() != nullptr && other->pane()->CanBeTabbedDocument());
+        return isOther && !tab->isFloating();
+    });
 }
 
 void PaneDock::standAlone()
@@ -106,7 +111,12 @@ void PaneDock::standAlone()
     }
     QMainWindow *frame = frameOf(*this);
     const Qt::DockWidgetArea area = frame->dockWidgetArea(this);
-    frame->addDockWidget(area == Qt::NoDockWidgetArea ? Qt::BottomDockWidgetArea : area, this);
+    const Qt::DockWidgetArea place = area == Qt::NoDockWidgetArea ? Qt::BottomDockWidgetArea : area;
+    if (auto *ofPanes = dynamic_cast<UXTPMDIFrameWnd *>(frame)) {
+        ofPanes->DockBar(*pane_, place);
+    } else {
+        frame->addDockWidget(place, this);
+    }
 }
 
 bool PaneDock::isBehindTab() const

@@ -26,6 +26,14 @@ bool holdsPanes(const QWidget *window, const QWidget *frame)
            (window != nullptr && window->inherits("QDockWidgetGroupWindow"));
 }
 
+bool belongsTo(const QWidget *widget, const QWidget &window)
+{
+    while (widget != nullptr && widget != &window) {
+        widget = widget->parentWidget();
+    }
+    return widget != nullptr;
+}
+
 void noteKeyboardWindow(const QWidget *window)
 {
     keyboardWindow() = window;

@@ -8,6 +8,9 @@ namespace kareport
 /// Whether a window is the frame, or one in which panes of the frame float. A dialog is neither.
 bool holdsPanes(const QWidget *window, const QWidget *frame);
 
+/// Whether a widget is a window or belongs to it, as its menus and its floating panes do, and what is in them.
+bool belongsTo(const QWidget *widget, const QWidget &window);
+
 /// Remembers a window that holds panes as the one in which the keyboard was last.
 void noteKeyboardWindow(const QWidget *window);
 

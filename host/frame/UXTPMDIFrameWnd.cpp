@@ -151,6 +151,11 @@ void UXTPMDIFrameWnd::DockPane(COneViewPane &pane)
     }
 }
 
+void UXTPMDIFrameWnd::DockBar(COneViewPane &pane, Qt::DockWidgetArea area)
+{
+    addDockWidget(area, pane.GetDock());
+}
+
 const std::vector<kareport::Command> &UXTPMDIFrameWnd::commands() const
 {
     static const std::vector<kareport::Command> none;

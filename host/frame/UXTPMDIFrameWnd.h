@@ -65,6 +65,8 @@ public:
 
     /// Docks a pane among the others: next to them as a tab, unless it has a place of its own.
     virtual void DockPane(COneViewPane &pane);
+    /// Docks a pane that is no tab among the documents at a side of the frame: next to what is docked there.
+    virtual void DockBar(COneViewPane &pane, Qt::DockWidgetArea area);
 
     const std::vector<kareport::Command> &commands() const override;
 

@@ -2,6 +2,7 @@
 #include "DeskCommandIds.h"
 #include "DeskFixture.h"
 #include "DeskPreferences.h"
+#include "UReportWindowDlg.h"
 
 #include <QClipboard>
 #include <QDialog>
@@ -209,6 +210,10 @@ TEST(ActivePaneDesk, TheTabKeyDoesNotLeadToARowWithoutTabs)
     const JobFolder folder;
     runJob(desk, folder, "a.json", "First line");
     runJob(desk, folder, "b.json", "First line");
+    settle();
+    // Side by side they have no tabs; the row in which they were is still there.
+    auto &window = dynamic_cast<UReportWindowDlg &>(*Desk::reports().back()->GetReportWindow());
+    desk.frame->addDockWidget(Qt::RightDockWidgetArea, window.GetDock());
     settle();
     for (int press = 1; press <= 4; ++press) {
         QTest::keyClick(QApplication::focusWidget(), Qt::Key_Tab);

@@ -79,6 +79,59 @@ TEST(DeskTabs, AReportWindowThatIsKeptStaysAndIsKeptAtTheNextStart)
     EXPECT_FALSE(loadPreferences().keepsReportWindows);
 }
 
+TEST(DeskTabs, ReportWindowsThatAreKeptAreTabsOfARowOfTheirOwn)
+{
+    const JobFolder folder;
+    folder.put("saved.rep", savedText("TALVEN"));
+    Desk desk;
+    desk.answer = MessageAnswer::No;
+    desk.keepReportWindows();
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("saved.rep")));
+    for (const char *name : {"a.json", "b.json", "c.json"}) {
+        folder.put(name, lineJob(name));
+        ASSERT_TRUE(desk.frame->OpenFile(folder.path(name)));
+        settle();
+    }
+    std::vector<UReportWindowDlg *> windows;
+    for (const UReportDoc *report : Desk::reports()) {
+        if (auto *window = dynamic_cast<UReportWindowDlg *>(report->GetReportWindow())) {
+            windows.push_back(window);
+        }
+    }
+    ASSERT_EQ(windows.size(), 3U);
+    QTabBar *tabs = tabsOf(desk);
+    ASSERT_NE(tabs, nullptr) << "columns";
+    EXPECT_EQ(tabs->count(), 3) << "the report with its text is not among them";
+    EXPECT_EQ(desk.frame->dockWidgetArea(windows[0]->GetDock()), Qt::BottomDockWidgetArea);
+    EXPECT_GT(windows[2]->GetDock()->width(), desk.frame->width() * 9 / 10);
+    EXPECT_TRUE(windows[2]->IsInFront()) << "the last one that was opened";
+    EXPECT_FALSE(windows[0]->IsInFront());
+    EXPECT_EQ(desk.frame->GetCommandDocument(), windows[2]->GetReportDoc());
+    QTest::mouseClick(tabs, Qt::LeftButton, Qt::NoModifier, tabs->tabRect(0).center());
+    settle();
+    EXPECT_TRUE(windows[0]->IsInFront());
+    EXPECT_EQ(desk.frame->GetCommandDocument(), windows[0]->GetReportDoc());
+    EXPECT_EQ(wrongWithActive(*desk.frame), QString());
+
+    // The one of the middle is opened with its text; the others stay together.
+    windows[1]->ShowReport();
+    settle();
+    EXPECT_EQ(desk.frame->tabifiedDockWidgets(windows[0]->GetDock()), QList<QDockWidget *>{windows[2]->GetDock()});
+    EXPECT_TRUE(desk.frame->GetActiveView() != nullptr);
+
+    // One that the user has put elsewhere takes the next one along.
+    desk.frame->addDockWidget(Qt::RightDockWidgetArea, windows[0]->GetDock());
+    windows[2]->ClosePane();
+    settle();
+    folder.put("d.json", lineJob("d"));
+    ASSERT_TRUE(desk.frame->OpenFile(folder.path("d.json")));
+    settle();
+    auto *last = dynamic_cast<UReportWindowDlg *>(Desk::reports().back()->GetReportWindow());
+    ASSERT_NE(last, nullptr);
+    EXPECT_EQ(desk.frame->dockWidgetArea(last->GetDock()), Qt::RightDockWidgetArea);
+    EXPECT_EQ(desk.frame->tabifiedDockWidgets(last->GetDock()), QList<QDockWidget *>{windows[0]->GetDock()});
+}
+
 TEST(DeskTabs, ChangesThatAreNotSavedAreMarkedInTabAndTitle)
 {
     const JobFolder folder;

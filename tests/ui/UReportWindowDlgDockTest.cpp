@@ -67,6 +67,27 @@ TEST_F(ReportWindowDock, IsNeverATabAmongTheDocuments)
     EXPECT_TRUE(desk.frame->tabifiedDockWidgets(document).contains(secondDocument)) << "the documents stay together";
 }
 
+TEST_F(ReportWindowDock, MayBeATabAmongReportWindows)
+{
+    UReportDoc *report = desk.openReport(QStringLiteral("Survey"));
+    QDockWidget *document = dynamic_cast<COneViewPane *>(report->GetFrameWindow())->GetDock();
+    ASSERT_TRUE(create());
+    UReportWindowDlg other;
+    ASSERT_TRUE(other.createDocked(QStringLiteral("Other"), nullptr));
+    WindowDesk::settle();
+    EXPECT_TRUE(desk.frame->tabifiedDockWidgets(window.GetDock()).isEmpty()) << "as the frame docks them";
+    desk.frame->tabifyDockWidget(window.GetDock(), other.GetDock());
+    WindowDesk::settle();
+    WindowDesk::settle();
+    EXPECT_EQ(desk.frame->tabifiedDockWidgets(window.GetDock()), QList<QDockWidget *>{other.GetDock()});
+
+    desk.frame->tabifyDockWidget(window.GetDock(), document);
+    EXPECT_TRUE(QTest::qWaitFor([&] { return desk.frame->tabifiedDockWidgets(document).isEmpty(); }, 5000))
+        << "a document put to them";
+    EXPECT_TRUE(window.IsVisible());
+    EXPECT_TRUE(other.IsVisible());
+}
+
 TEST_F(ReportWindowDock, AFrameThatMakesTabsOfEverythingIsObeyed)
 {
     UReportDoc *report = desk.openReport(QStringLiteral("Survey"));
