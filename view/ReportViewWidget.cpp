@@ -62,15 +62,15 @@ ReportViewWidget::ReportViewWidget(QWidget *parent)
       pageBar_(
           new PageBar([this](int page) { goFromBar(page); }, [this] { edit_->setFocus(Qt::OtherFocusReason); }, this)),
       pageLabel_(newLabel(this, Xlate("Page"), Xlate("Page %1 of %2").arg(88888).arg(88888))),
-      lineLabel_(newLabel(this, Xlate("Line"), Xlate("Line %1").arg(8888888))),
-      columnLabel_(newLabel(this, Xlate("Column"), Xlate("Column %1").arg(8888))),
+      lineLabel_(newLabel(this, Xlate("Line"), Xlate("Line %1").arg(88888))),
+      columnLabel_(newLabel(this, Xlate("Column"), Xlate("Column %1").arg(888))),
       loadLabel_(newLabel(this, Xlate("Loading"), Xlate("Loading %1 %@@percent of a report").arg(100))),
       zoomLabel_(newLabel(this, Xlate("Zoom"), Xlate("%1 %@@zoom in percent").arg(888))),
       statusRow_(new QHBoxLayout)
 {
     QHBoxLayout *status = statusRow_;
     status->setContentsMargins(6, 2, 6, 2);
-    status->setSpacing(12);
+    status->setSpacing(8);
     status->addWidget(pageLabel_);
     status->addWidget(lineLabel_);
     status->addWidget(columnLabel_);
@@ -102,6 +102,7 @@ ReportViewWidget::ReportViewWidget(QWidget *parent)
     for (QWidget *child : findChildren<QWidget *>()) {
         child->installEventFilter(this); // wherever the mouse is pressed
     }
+    loadLabel_->hide(); // while there is nothing to say it takes no room from a narrow window
     showPlace();
     showZoom();
 }
@@ -238,6 +239,7 @@ void ReportViewWidget::showLoading()
         edit_->isLoading() ? Xlate("Loading %1 %@@percent of a report").arg(edit_->loadedPercent()) : QString();
     if (text != loadLabel_->text() || !edit_->isLoading()) { // there are more pieces than percents
         showIn(*loadLabel_, text);
+        loadLabel_->setVisible(!text.isEmpty());
         placeTimer_.start();
     }
 }

@@ -337,6 +337,39 @@ TEST(SheetReportView, PageAndZoomAreShownAndChosenBelow)
     EXPECT_EQ(shown.edit().zoomPercent(), 110);
 }
 
+TEST(SheetReportView, TwoReportsHaveRoomSideBySide)
+{
+    constexpr int usualWidth = 1000; // of the main window
+    SheetReport shown;
+    shown.writePages(20, 60);
+    QCoreApplication::processEvents();
+    EXPECT_LT(shown.window().minimumSizeHint().width(), usualWidth / 2);
+    shown.show(Shows::Both);
+    EXPECT_LT(shown.window().minimumSizeHint().width(), usualWidth / 2);
+}
+
+TEST(SheetReportView, TheCursorStandsBeforeItsCharacter)
+{
+    SheetReport shown;
+    shown.writePages(2, 60);
+    shown.show(Shows::Sheets);
+    shown.sheets().setFocus();
+    // At the end of a line, where no letter is near.
+    QTextCursor cursor(shown.edit().document()->findBlockByNumber(4));
+    cursor.movePosition(QTextCursor::EndOfBlock);
+    shown.edit().setTextCursor(cursor);
+    QCoreApplication::processEvents();
+    const QRectF place = shown.sheets().cursorRect();
+    ASSERT_GT(place.height(), 4);
+    const QImage drawn = shown.sheets().viewport()->grab().toImage();
+    const QColor mark = shown.sheets().palette().color(QPalette::Highlight);
+    const int y = qRound(place.center().y());
+    const int x = qRound(place.left());
+    ASSERT_TRUE(drawn.rect().contains(x, y));
+    EXPECT_EQ(drawn.pixelColor(x - 1, y), mark);
+    EXPECT_NE(drawn.pixelColor(x, y), mark) << "the character that follows is not covered";
+}
+
 TEST(SheetReportView, AnEmptyReportSaysSo)
 {
     SheetReport shown;
