@@ -1,6 +1,7 @@
+// Fields, tables, blocks and dictionaries that are inserted into the text of a template.
 #include "TemplateEdits.h"
 
-#include "FieldMarker.h"
+#include "TemplateLines.h"
 #include "TextFolding.h"
 #include "VariableKeywords.h"
 #include "VariableType.h"
@@ -17,104 +18,6 @@ namespace kareport
 
 namespace
 {
-
-bool isIndentation(QStringView text)
-{
-    return std::all_of(text.begin(), text.end(), [](QChar one) { return one == u' ' || one == u'\t'; });
-}
-
-qsizetype lineStartOf(const QString &text, qsizetype position)
-{
-    return position <= 0 ? 0 : text.lastIndexOf(u'\n', position - 1) + 1;
-}
-
-/// The blanks and tabs that the line of a position begins with.
-QString indentationAt(const QString &text, qsizetype position)
-{
-    const qsizetype start = lineStartOf(text, position);
-    qsizetype end = start;
-    while (end < text.size() && (text[end] == u' ' || text[end] == u'\t')) {
-        ++end;
-    }
-    return text.mid(start, end - start);
-}
-
-/// What a line is indented by in an element.
-QString indentationUnit(const QString &text)
-{
-    for (qsizetype at = text.indexOf(u'\n'); at >= 0 && at + 1 < text.size(); at = text.indexOf(u'\n', at + 1)) {
-        if (text[at + 1] == u'\t') {
-            break;
-        }
-        if (text[at + 1] == u' ') {
-            return indentationAt(text, at + 1);
-        }
-    }
-    return QStringLiteral("\t");
-}
-
-QString element(const char *name, const QString &value)
-{
-    const QString tag = QString::fromLatin1(name);
-    return u'<' + tag + u'>' + value + QStringLiteral("</") + tag + u'>';
-}
-
-/// Lines of text, each with its depth as tabs.
-QString indented(const QStringList &lines, const QString &indentation, const QString &unit)
-{
-    QString text;
-    for (QString line : lines) {
-        QString front = indentation;
-        while (line.startsWith(u'\t')) {
-            line.remove(0, 1);
-            front += unit;
-        }
-        text += front + line + u'\n';
-    }
-    return text;
-}
-
-/// Puts lines at the end of what an element holds, before its closing tag.
-void insertInside(QString &text, const TextRange &inside, const QStringList &lines)
-{
-    const QString unit = indentationUnit(text);
-    const qsizetype close = text.indexOf(u'<', inside.end);
-    const qsizetype closeAt = close < 0 ? text.size() : close;
-    const qsizetype start = lineStartOf(text, closeAt);
-    const QString outer = indentationAt(text, closeAt);
-    if (isIndentation(QStringView(text).sliced(start, closeAt - start))) {
-        text.insert(start, indented(lines, outer + unit, unit));
-    } else {
-        text.insert(closeAt, u'\n' + indented(lines, outer + unit, unit) + outer);
-    }
-}
-
-/// Puts lines after an element. @param end  of the element
-void insertAfter(QString &text, qsizetype end, const QStringList &lines)
-{
-    const QString unit = indentationUnit(text);
-    QString added = u'\n' + indented(lines, indentationAt(text, end), unit);
-    added.chop(1); // the line goes on as it did
-    text.insert(end, added);
-}
-
-/// The end of an element with its closing tag.
-qsizetype endOfElement(const QString &text, const TextRange &inside)
-{
-    const qsizetype close = text.indexOf(u'>', inside.end);
-    return close < 0 ? text.size() : close + 1;
-}
-
-/// A name with a number that none of the others has.
-QString freeName(const QString &front, const QStringList &others)
-{
-    for (int number = 1;; ++number) {
-        const QString name = front + QString::number(number);
-        if (!others.contains(name, Qt::CaseInsensitive)) {
-            return name;
-        }
-    }
-}
 
 struct UsualFormat
 {
@@ -210,16 +113,6 @@ OutlineVariable nextVariable(const OutlineTemplate &one, const OutlineOutput &ou
     return dictionary->variables.front();
 }
 
-/// Selects the value of an element at or after a position.
-TextRange valueAfter(const QString &text, qsizetype position, const char *name)
-{
-    const QString tag = u'<' + QString::fromLatin1(name) + u'>';
-    const qsizetype at = text.indexOf(tag, position, Qt::CaseInsensitive);
-    const qsizetype begin = at < 0 ? position : at + tag.size();
-    const qsizetype end = at < 0 ? position : text.indexOf(u'<', begin);
-    return {begin, end < 0 ? text.size() : end};
-}
-
 EditedTemplate refused(const QString &text, const QString &problem)
 {
     return {text, {}, problem};
@@ -271,85 +164,32 @@ void insertIntoList(QString &text, const OutlineTemplate &one, const TextRange &
     }
 }
 
-/// The places where the variable of a dictionary is named in a template.
-std::vector<TextRange> usesOf(const OutlineTemplate &one, const VariableUse &use)
+/// The value before which a table or block has its fields.
+TextRange headOf(const OutlineOutput &output)
 {
-    std::vector<TextRange> ranges;
-    const auto add = [&](const OutlineValue &value) {
-        if (value.range.exists() && equalFolded(value.text, use.name)) {
-            ranges.push_back(value.range);
-        }
-    };
-    for (const OutlineDictionary &dictionary : one.dictionaryList) {
-        for (const OutlineVariable &variable : dictionary.variables) {
-            if (equalFolded(dictionary.name.text, use.dictionary)) {
-                add(variable.name);
-            }
-        }
-    }
-    for (const OutlineOutput &output : one.outputs) {
-        if (!equalFolded(output.use.text, use.dictionary)) {
-            continue;
-        }
-        for (const OutlineField &field : output.fields) {
-            add(field.variable);
-        }
-        for (const OutlineValue &key : output.sortKeys) {
-            add(key);
-        }
-    }
-    return ranges;
-}
-
-std::optional<VariableUse> useAt(const OutlineTemplate &one, qsizetype position)
-{
-    for (const OutlineDictionary &dictionary : one.dictionaryList) {
-        for (const OutlineVariable &variable : dictionary.variables) {
-            if (variable.element.touches(position)) {
-                return VariableUse{dictionary.name.text, variable.name.text};
-            }
-        }
-    }
-    for (const OutlineOutput &output : one.outputs) {
-        for (const OutlineField &field : output.fields) {
-            if (field.element.touches(position)) {
-                return VariableUse{output.use.text, field.variable.text};
-            }
-        }
-        for (const OutlineValue &key : output.sortKeys) {
-            if (key.range.touches(position)) {
-                return VariableUse{output.use.text, key.text};
-            }
-        }
-    }
-    return std::nullopt;
-}
-
-/// What is wrong with a new name of a variable.
-QString wrongName(const OutlineTemplate &one, const VariableUse &use, const QString &name)
-{
-    if (name.trimmed().isEmpty() || name != name.trimmed()) {
-        return Xlate("A name without blanks at its ends was expected.");
-    }
-    if (name.contains(u'<') || name.contains(u'>') || name.contains(u'\n') || name.contains(u'\t')) {
-        return Xlate("A name without < and > was expected.");
-    }
-    if (fieldMarker(name) != FieldMarker::None) {
-        return Xlate("\"%1\" cannot be the name of a variable: it has a meaning of its own.").arg(name);
-    }
-    const bool isTaken = !equalFolded(name, use.name) && !usesOf(one, {use.dictionary, name}).empty();
-    return isTaken ? Xlate("There is already a variable \"%1\".").arg(name) : QString();
+    return output.use.range.exists() ? output.use.range : output.name.range;
 }
 
 } // namespace
 
+QString whyNoField(const TemplateOutline &outline, qsizetype position)
+{
+    const OutlineOutput *output = outputAt(outline, position);
+    if (output == nullptr) {
+        return Xlate("A field belongs to a table or a block: put the cursor into one.");
+    }
+    return output->fields.empty() && !output->outputList.exists() && !headOf(*output).exists()
+               ? Xlate("The table or block needs a name first.")
+               : QString();
+}
+
 EditedTemplate withField(const QString &text, qsizetype position)
 {
     const TemplateOutline outline = outlineOf(text);
-    const OutlineOutput *output = outputAt(outline, position);
-    if (output == nullptr) {
-        return refused(text, Xlate("A field belongs to a table or a block: put the cursor into one."));
+    if (const QString wrong = whyNoField(outline, position); !wrong.isEmpty()) {
+        return refused(text, wrong);
     }
+    const OutlineOutput *output = outputAt(outline, position);
     const OutlineVariable variable = nextVariable(*outline.templateAt(position), *output);
     QString made = text;
     if (output->fields.empty()) {
@@ -358,10 +198,7 @@ EditedTemplate withField(const QString &text, qsizetype position)
             insertInside(made, output->outputList, line);
             return {made, valueAfter(made, output->outputList.begin, "Label"), QString()};
         }
-        const TextRange head = output->use.range.exists() ? output->use.range : output->name.range;
-        if (!head.exists()) {
-            return refused(text, Xlate("The table or block needs a name first."));
-        }
+        const TextRange head = headOf(*output);
         insertAfter(made, endOfElement(text, head),
                     {QStringLiteral("<OutputList>"), u'\t' + line.first(), QStringLiteral("</OutputList>")});
         return {made, valueAfter(made, head.end, "Label"), QString()};
@@ -433,59 +270,6 @@ EditedTemplate withOutput(const QString &text, qsizetype position, bool isTable)
     }
     const qsizetype found = made.indexOf(element("Name", name), std::max<qsizetype>(one.element.begin, 0));
     return {made, valueAfter(made, std::max<qsizetype>(found, 0), "Name"), QString()};
-}
-
-std::optional<VariableUse> variableAt(const QString &text, qsizetype position)
-{
-    const TemplateOutline outline = outlineOf(text);
-    const OutlineTemplate *one = outline.templateAt(position);
-    const auto use = one != nullptr ? useAt(*one, position) : std::nullopt;
-    return use && !use->name.isEmpty() && fieldMarker(use->name) == FieldMarker::None ? use : std::nullopt;
-}
-
-EditedTemplate withRenamedVariable(const QString &text, qsizetype position, const QString &name)
-{
-    const auto use = variableAt(text, position);
-    if (!use) {
-        return refused(text, Xlate("Put the cursor on a variable first: in a field, a sort key or a dictionary."));
-    }
-    const TemplateOutline outline = outlineOf(text);
-    const OutlineTemplate &one = *outline.templateAt(position);
-    if (const QString wrong = wrongName(one, *use, name); !wrong.isEmpty()) {
-        return refused(text, wrong);
-    }
-    std::vector<TextRange> ranges = usesOf(one, *use);
-    std::sort(ranges.begin(), ranges.end(),
-              [](const TextRange &left, const TextRange &right) { return left.begin > right.begin; });
-    EditedTemplate edited{text, {}, QString()};
-    for (const TextRange &range : ranges) {
-        const bool isHere = range.begin <= position;
-        edited.text.replace(range.begin, range.size(), name);
-        if (isHere && !edited.selection.exists()) {
-            edited.selection = {range.begin, range.begin + name.size()};
-        } else if (edited.selection.exists()) {
-            edited.selection.begin += name.size() - range.size();
-            edited.selection.end += name.size() - range.size();
-        }
-    }
-    return edited;
-}
-
-TextDifference differenceOf(const QString &before, const QString &after)
-{
-    const qsizetype most = std::min(before.size(), after.size());
-    qsizetype front = 0;
-    while (front < most && before[front] == after[front]) {
-        ++front;
-    }
-    qsizetype back = 0;
-    while (back < most - front && before[before.size() - 1 - back] == after[after.size() - 1 - back]) {
-        ++back;
-    }
-    // A pair of characters that make one is not taken apart.
-    front -= front > 0 && before[front - 1].isHighSurrogate() ? 1 : 0;
-    back -= back > 0 && after[after.size() - back].isLowSurrogate() ? 1 : 0;
-    return {front, before.size() - front - back, after.mid(front, after.size() - front - back)};
 }
 
 } // namespace kareport

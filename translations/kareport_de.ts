@@ -1789,18 +1789,13 @@
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresColumns.cpp"/>
-        <source>the query has %1 parameters: values of %2 are given</source>
-        <translation>die Abfrage hat %1 Parameter: Werte von %2 sind angegeben</translation>
-    </message>
-    <message>
-        <location filename="../sources/postgresql/PostgresColumns.cpp"/>
-        <source>the query is not a single SELECT, which was expected</source>
-        <translation>die Abfrage ist kein einzelnes SELECT, wie es erwartet wurde</translation>
-    </message>
-    <message>
-        <location filename="../sources/postgresql/PostgresColumns.cpp"/>
         <source>the columns "%1" and "%2" both have geometries: a query with one of them was expected</source>
         <translation>die Spalten "%1" und "%2" haben beide Geometrien: eine Abfrage mit einer davon wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresColumns.cpp"/>
+        <source>%1 bytes</source>
+        <translation>%1 Bytes</translation>
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresConnection.cpp"/>
@@ -1843,24 +1838,34 @@
         <translation>die Datenbank beantwortet die Abfrage nicht: %1</translation>
     </message>
     <message>
+        <location filename="../sources/postgresql/PostgresPreview.cpp"/>
+        <source>(bytes)</source>
+        <translation>(Bytes)</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresPreview.cpp"/>
+        <source>there is %1: a point was expected</source>
+        <translation>es steht dort %1: ein Punkt wurde erwartet</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresPreview.cpp"/>
+        <source>row %1: </source>
+        <translation>Zeile %1: </translation>
+    </message>
+    <message>
         <location filename="../sources/postgresql/PostgresResult.cpp"/>
         <source>(character %1 of the query)</source>
         <translation>(Zeichen %1 der Abfrage)</translation>
     </message>
     <message>
-        <location filename="../sources/postgresql/PostgresRows.cpp"/>
-        <source>%1 bytes</source>
-        <translation>%1 Bytes</translation>
+        <location filename="../sources/postgresql/PostgresRowsColumns.cpp"/>
+        <source>the query has %1 parameters: values of %2 are given</source>
+        <translation>die Abfrage hat %1 Parameter: Werte von %2 sind angegeben</translation>
     </message>
     <message>
-        <location filename="../sources/postgresql/PostgresRows.cpp"/>
-        <source>there is %1: a point was expected</source>
-        <translation>es steht dort %1: ein Punkt wurde erwartet</translation>
-    </message>
-    <message>
-        <location filename="../sources/postgresql/PostgresRows.cpp"/>
-        <source>row %1: </source>
-        <translation>Zeile %1: </translation>
+        <location filename="../sources/postgresql/PostgresRowsColumns.cpp"/>
+        <source>the query is not a single SELECT, which was expected</source>
+        <translation>die Abfrage ist kein einzelnes SELECT, wie es erwartet wurde</translation>
     </message>
     <message>
         <location filename="../sources/sqlite/SqliteColumns.cpp"/>
@@ -1916,11 +1921,6 @@
         <location filename="../sources/sqlite/SqliteFile.cpp"/>
         <source>the database was changed while it was read, by a program that does not use SQLite</source>
         <translation>die Datenbank wurde beim Lesen verändert, von einem Programm, das nicht SQLite verwendet</translation>
-    </message>
-    <message>
-        <location filename="../sources/sqlite/SqlitePreview.cpp"/>
-        <source>(bytes)</source>
-        <translation>(Bytes)</translation>
     </message>
     <message>
         <location filename="../exports/CsvResult.cpp"/>
@@ -2804,26 +2804,6 @@
     </message>
     <message>
         <location filename="../preview/TemplateEdits.cpp"/>
-        <source>A name without blanks at its ends was expected.</source>
-        <translation>Ein Name ohne Leerzeichen an seinen Enden wurde erwartet.</translation>
-    </message>
-    <message>
-        <location filename="../preview/TemplateEdits.cpp"/>
-        <source>A name without &lt; and &gt; was expected.</source>
-        <translation>Ein Name ohne &lt; und &gt; wurde erwartet.</translation>
-    </message>
-    <message>
-        <location filename="../preview/TemplateEdits.cpp"/>
-        <source>"%1" cannot be the name of a variable: it has a meaning of its own.</source>
-        <translation>„%1“ ist keine Variable: der Name hat eine eigene Bedeutung.</translation>
-    </message>
-    <message>
-        <location filename="../preview/TemplateEdits.cpp"/>
-        <source>There is already a variable "%1".</source>
-        <translation>Es gibt schon eine Variable „%1“.</translation>
-    </message>
-    <message>
-        <location filename="../preview/TemplateEdits.cpp"/>
         <source>A field belongs to a table or a block: put the cursor into one.</source>
         <translation>Ein Feld gehört in eine Tabelle oder einen Block: setzen Sie die Schreibmarke dorthin.</translation>
     </message>
@@ -2836,11 +2816,6 @@
         <location filename="../preview/TemplateEdits.cpp"/>
         <source>The template cannot be read: correct what the list of remarks says first.</source>
         <translation>Die Vorlage kann nicht gelesen werden: beheben Sie zuerst, was in der Liste der Anmerkungen steht.</translation>
-    </message>
-    <message>
-        <location filename="../preview/TemplateEdits.cpp"/>
-        <source>Put the cursor on a variable first: in a field, a sort key or a dictionary.</source>
-        <translation>Setzen Sie die Schreibmarke zuerst auf eine Variable: in einem Feld, einem Sortierschlüssel oder einem Wörterbuch.</translation>
     </message>
     <message>
         <location filename="../preview/TemplatePreview.cpp"/>
@@ -2856,6 +2831,31 @@
         <location filename="../preview/TemplatePreview.cpp"/>
         <source>the template file cannot be written for its preview: %1</source>
         <translation>die Vorlagendatei kann für ihre Vorschau nicht geschrieben werden: %1</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateVariables.cpp"/>
+        <source>A name without blanks at its ends was expected.</source>
+        <translation>Ein Name ohne Leerzeichen an seinen Enden wurde erwartet.</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateVariables.cpp"/>
+        <source>A name without &lt; and &gt; was expected.</source>
+        <translation>Ein Name ohne &lt; und &gt; wurde erwartet.</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateVariables.cpp"/>
+        <source>"%1" cannot be the name of a variable: it has a meaning of its own.</source>
+        <translation>„%1“ ist keine Variable: der Name hat eine eigene Bedeutung.</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateVariables.cpp"/>
+        <source>There is already a variable "%1".</source>
+        <translation>Es gibt schon eine Variable „%1“.</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateVariables.cpp"/>
+        <source>Put the cursor on a variable first: in a field, a sort key or a dictionary.</source>
+        <translation>Setzen Sie die Schreibmarke zuerst auf eine Variable: in einem Feld, einem Sortierschlüssel oder einem Wörterbuch.</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CheckCommand.cpp"/>
@@ -3909,6 +3909,21 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>Ser&amp;ver...</source>
+        <translation>&amp;Server...</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>Choose a table of a database server</source>
+        <translation>Tabelle eines Datenbankservers wählen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>Tables of a PostgreSQL server</source>
+        <translation>Tabellen eines PostgreSQL-Servers</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>&amp;File:</source>
         <translation>&amp;Datei:</translation>
     </message>
@@ -3936,6 +3951,11 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Data (*.csv *.txt *.xml *.landxml *.gpkg *.sqlite *.db);;All files (*)</source>
         <translation>Daten (*.csv *.txt *.xml *.landxml *.gpkg *.sqlite *.db);;Alle Dateien (*)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialogFiles.cpp"/>
+        <source>Press Server to list the tables of this connection.</source>
+        <translation>„Server“ listet die Tabellen dieser Verbindung auf.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialogFiles.cpp"/>
@@ -4378,6 +4398,11 @@ Sollen sie wieder geöffnet werden?</translation>
         <translation>&amp;Lizenzen</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/help/GuideBrowser.cpp"/>
+        <source>Guide</source>
+        <translation>Handbuch</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
         <source>Working with KaReport</source>
         <translation>Arbeiten mit KaReport</translation>
@@ -4434,11 +4459,6 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/help/HelpWindow.cpp"/>
-        <source>Guide</source>
-        <translation>Handbuch</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/help/HelpWindow.cpp"/>
         <source>Back</source>
         <translation>Zurück</translation>
     </message>
@@ -4463,132 +4483,137 @@ Sollen sie wieder geöffnet werden?</translation>
         <translation>Nicht auf dieser Seite</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportDatabase.cpp"/>
+        <source>the table was not read. Choose it again to read it</source>
+        <translation>die Tabelle wurde nicht gelesen. Wählen Sie sie noch einmal, um sie zu lesen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Comma</source>
         <translation>Komma</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Semicolon</source>
         <translation>Semikolon</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Tab</source>
         <translation>Tabulator</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Vertical bar</source>
         <translation>Senkrechter Strich</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Blanks and tabs</source>
         <translation>Leerzeichen und Tabulatoren</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Point: 1.5</source>
         <translation>Punkt: 1.5</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Comma: 1,5</source>
         <translation>Komma: 1,5</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>First &amp;row names the columns</source>
         <translation>&amp;Erste Zeile benennt die Spalten</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Tabl&amp;e:</source>
         <translation>Tab&amp;elle:</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Table of the database</source>
         <translation>Tabelle der Datenbank</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Deli&amp;miter:</source>
         <translation>Trenn&amp;zeichen:</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Delimiter</source>
         <translation>Trennzeichen</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Decimal s&amp;ign:</source>
         <translation>Dez&amp;imalzeichen:</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Decimal sign</source>
         <translation>Dezimalzeichen</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>En&amp;coding:</source>
         <translation>&amp;Kodierung:</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Encoding</source>
         <translation>Kodierung</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>&amp;Order:</source>
         <translation>Rei&amp;henfolge:</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Order of the columns</source>
         <translation>Reihenfolge der Spalten</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>&amp;Lengths are:</source>
         <translation>&amp;Längen sind in:</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Unit of lengths in the data</source>
         <translation>Einheit der Längen in den Daten</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>&amp;Areas are:</source>
         <translation>Fl&amp;ächen sind in:</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Unit of areas in the data</source>
         <translation>Einheit der Flächen in den Daten</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>A&amp;ngles are:</source>
         <translation>&amp;Winkel sind in:</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Unit of angles in the data</source>
         <translation>Einheit der Winkel in den Daten</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>First row names the columns</source>
         <translation>Erste Zeile benennt die Spalten</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>P number, N northing, E easting, Z elevation, D description, - not read</source>
         <translation>P Nummer, N Hochwert, E Rechtswert, Z Höhe, D Beschreibung, - nicht gelesen</translation>
     </message>
@@ -4599,11 +4624,6 @@ Sollen sie wieder geöffnet werden?</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
-        <source>the database has no table</source>
-        <translation>die Datenbank hat keine Tabelle</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
         <source>Database</source>
         <translation>Datenbank</translation>
     </message>
@@ -4611,6 +4631,11 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
         <source>Text file</source>
         <translation>Textdatei</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>the database has no table</source>
+        <translation>die Datenbank hat keine Tabelle</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
@@ -4626,6 +4651,101 @@ Sollen sie wieder geöffnet werden?</translation>
         <location filename="../apps/kareport-desk/import/ImportPanelRows.cpp"/>
         <source>Variable of the column %1</source>
         <translation>Variable der Spalte %1</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>Tables of a PostgreSQL Server</source>
+        <translation>Tabellen eines PostgreSQL-Servers</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>&amp;Service:</source>
+        <translation>&amp;Dienst:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>Service</source>
+        <translation>Dienst</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>an entry of ~/.pg_service.conf, or the fields below</source>
+        <translation>ein Eintrag von ~/.pg_service.conf, oder die Felder darunter</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>&amp;Host:</source>
+        <translation>&amp;Host:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>Host</source>
+        <translation>Host</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>&amp;Port:</source>
+        <translation>&amp;Port:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>Port</source>
+        <translation>Port</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>&amp;Database:</source>
+        <translation>D&amp;atenbank:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>&amp;User:</source>
+        <translation>&amp;Benutzer:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>User</source>
+        <translation>Benutzer</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>&amp;More:</source>
+        <translation>&amp;Weiteres:</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>More of the connection</source>
+        <translation>Weiteres zur Verbindung</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>A password is read from your password file (~/.pgpass) or from PGPASSWORD. It is part of no job.</source>
+        <translation>Ein Kennwort wird aus Ihrer Kennwortdatei (~/.pgpass) oder aus PGPASSWORD gelesen. Es steht in keinem Auftrag.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>Why there are no tables</source>
+        <translation>Warum es keine Tabellen gibt</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>&amp;List Tables</source>
+        <translation>Tabellen auf&amp;listen</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>Listing the tables of the server</source>
+        <translation>Die Tabellen des Servers werden aufgelistet</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>The server was not waited for.</source>
+        <translation>Auf den Server wurde nicht gewartet.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>The database has no table that this user may read.</source>
+        <translation>Die Datenbank hat keine Tabelle, die dieser Benutzer lesen darf.</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/main.cpp"/>
@@ -4653,17 +4773,17 @@ Sollen sie wieder geöffnet werden?</translation>
         <translation>„%1“ wurde nicht neu erstellt: %2</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
+        <location filename="../apps/kareport-desk/run/DeskRunsFiles.cpp"/>
         <source>Files of "%1" have changed. Press F5 to make it again.</source>
         <translation>Woraus „%1“ erstellt wurde, hat sich geändert. F5 erstellt es neu.</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
+        <location filename="../apps/kareport-desk/run/DeskRunsFiles.cpp"/>
         <source>Jobs</source>
         <translation>Aufträge</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
+        <location filename="../apps/kareport-desk/run/DeskRunsFiles.cpp"/>
         <source>The job was saved as "%1".</source>
         <translation>Der Auftrag wurde als „%1“ gespeichert.</translation>
     </message>
@@ -5034,72 +5154,92 @@ Sollen sie wieder geöffnet werden?</translation>
         <translation>Stand der Seiten</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
+        <source>The template can only be read: it has characters that cannot be shown here.</source>
+        <translation>Die Vorlage kann nur gelesen werden: sie hat Zeichen, die hier nicht gezeigt werden können.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
+        <source>The template has no changes that are not saved.</source>
+        <translation>Die Vorlage hat keine ungespeicherten Änderungen.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>Save &amp;As...	Ctrl+Shift+S</source>
         <translation>Speichern &amp;unter ...	Ctrl+Shift+S</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>Choose &amp;Data...	Ctrl+D</source>
         <translation>&amp;Daten wählen ...	Ctrl+D</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>&amp;Close	Ctrl+W</source>
         <translation>S&amp;chließen	Ctrl+W</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
-        <source>&amp;Find and Replace...	Ctrl+F</source>
-        <translation>&amp;Suchen und Ersetzen ...	Ctrl+F</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>C&amp;omplete	Ctrl+Space</source>
         <translation>&amp;Vervollständigen	Ctrl+Space</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>Rena&amp;me Variable...	F2</source>
         <translation>Variable &amp;umbenennen ...	F2</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
+        <source>No text has been looked for yet.</source>
+        <translation>Es wurde noch kein Text gesucht.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
+        <source>&amp;Find and Replace...	Ctrl+F</source>
+        <translation>&amp;Suchen und Ersetzen ...	Ctrl+F</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>&amp;Insert</source>
         <translation>&amp;Einfügen</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>&amp;Field	Ctrl+Shift+F</source>
         <translation>&amp;Feld	Ctrl+Shift+F</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>&amp;Table	Ctrl+Shift+T</source>
         <translation>&amp;Tabelle	Ctrl+Shift+T</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>&amp;Block	Ctrl+Shift+B</source>
         <translation>&amp;Block	Ctrl+Shift+B</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>&amp;Dictionary	Ctrl+Shift+D</source>
         <translation>&amp;Wörterbuch	Ctrl+Shift+D</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
+        <source>There are no remarks on the template.</source>
+        <translation>Zur Vorlage gibt es keine Anmerkungen.</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>&amp;Next Remark	F8</source>
         <translation>&amp;Nächste Anmerkung	F8</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>&amp;Previous Remark	Shift+F8</source>
         <translation>&amp;Vorige Anmerkung	Shift+F8</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>Text, &amp;Pages, Remarks	F6</source>
         <translation>Text, &amp;Seiten, Anmerkungen	F6</translation>
     </message>

@@ -1789,18 +1789,13 @@
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresColumns.cpp"/>
-        <source>the query has %1 parameters: values of %2 are given</source>
-        <translation>クエリにはパラメーターが %1 個あります: 与えられた値は %2 個です</translation>
-    </message>
-    <message>
-        <location filename="../sources/postgresql/PostgresColumns.cpp"/>
-        <source>the query is not a single SELECT, which was expected</source>
-        <translation>クエリは単一の SELECT ではありません。単一の SELECT が必要です</translation>
-    </message>
-    <message>
-        <location filename="../sources/postgresql/PostgresColumns.cpp"/>
         <source>the columns "%1" and "%2" both have geometries: a query with one of them was expected</source>
         <translation>列 "%1" と "%2" の両方にジオメトリがあります: そのうち 1 つだけを含むクエリが必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresColumns.cpp"/>
+        <source>%1 bytes</source>
+        <translation>%1 バイト</translation>
     </message>
     <message>
         <location filename="../sources/postgresql/PostgresConnection.cpp"/>
@@ -1843,24 +1838,34 @@
         <translation>データベースがクエリに応答しません: %1</translation>
     </message>
     <message>
+        <location filename="../sources/postgresql/PostgresPreview.cpp"/>
+        <source>(bytes)</source>
+        <translation>(バイト列)</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresPreview.cpp"/>
+        <source>there is %1: a point was expected</source>
+        <translation>%1 があります: 点が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/postgresql/PostgresPreview.cpp"/>
+        <source>row %1: </source>
+        <translation>行 %1: </translation>
+    </message>
+    <message>
         <location filename="../sources/postgresql/PostgresResult.cpp"/>
         <source>(character %1 of the query)</source>
         <translation>(クエリの %1 文字目)</translation>
     </message>
     <message>
-        <location filename="../sources/postgresql/PostgresRows.cpp"/>
-        <source>%1 bytes</source>
-        <translation>%1 バイト</translation>
+        <location filename="../sources/postgresql/PostgresRowsColumns.cpp"/>
+        <source>the query has %1 parameters: values of %2 are given</source>
+        <translation>クエリにはパラメーターが %1 個あります: 与えられた値は %2 個です</translation>
     </message>
     <message>
-        <location filename="../sources/postgresql/PostgresRows.cpp"/>
-        <source>there is %1: a point was expected</source>
-        <translation>%1 があります: 点が必要です</translation>
-    </message>
-    <message>
-        <location filename="../sources/postgresql/PostgresRows.cpp"/>
-        <source>row %1: </source>
-        <translation>行 %1: </translation>
+        <location filename="../sources/postgresql/PostgresRowsColumns.cpp"/>
+        <source>the query is not a single SELECT, which was expected</source>
+        <translation>クエリは単一の SELECT ではありません。単一の SELECT が必要です</translation>
     </message>
     <message>
         <location filename="../sources/sqlite/SqliteColumns.cpp"/>
@@ -1916,11 +1921,6 @@
         <location filename="../sources/sqlite/SqliteFile.cpp"/>
         <source>the database was changed while it was read, by a program that does not use SQLite</source>
         <translation>読み取り中に、SQLite を使わないプログラムによってデータベースが変更されました</translation>
-    </message>
-    <message>
-        <location filename="../sources/sqlite/SqlitePreview.cpp"/>
-        <source>(bytes)</source>
-        <translation>(バイト列)</translation>
     </message>
     <message>
         <location filename="../exports/CsvResult.cpp"/>
@@ -2804,26 +2804,6 @@
     </message>
     <message>
         <location filename="../preview/TemplateEdits.cpp"/>
-        <source>A name without blanks at its ends was expected.</source>
-        <translation>前後に空白のない名前が必要です。</translation>
-    </message>
-    <message>
-        <location filename="../preview/TemplateEdits.cpp"/>
-        <source>A name without &lt; and &gt; was expected.</source>
-        <translation>&lt; と &gt; を含まない名前が必要です。</translation>
-    </message>
-    <message>
-        <location filename="../preview/TemplateEdits.cpp"/>
-        <source>"%1" cannot be the name of a variable: it has a meaning of its own.</source>
-        <translation>"%1" は変数ではありません。特別な意味を持つ名前です。</translation>
-    </message>
-    <message>
-        <location filename="../preview/TemplateEdits.cpp"/>
-        <source>There is already a variable "%1".</source>
-        <translation>変数 "%1" は既にあります。</translation>
-    </message>
-    <message>
-        <location filename="../preview/TemplateEdits.cpp"/>
         <source>A field belongs to a table or a block: put the cursor into one.</source>
         <translation>フィールドは表またはブロックに属します。その中にカーソルを置いてください。</translation>
     </message>
@@ -2836,11 +2816,6 @@
         <location filename="../preview/TemplateEdits.cpp"/>
         <source>The template cannot be read: correct what the list of remarks says first.</source>
         <translation>テンプレートを読み取れません。先に指摘の一覧の内容を直してください。</translation>
-    </message>
-    <message>
-        <location filename="../preview/TemplateEdits.cpp"/>
-        <source>Put the cursor on a variable first: in a field, a sort key or a dictionary.</source>
-        <translation>先に、フィールド、並べ替えキーまたは辞書の変数にカーソルを置いてください。</translation>
     </message>
     <message>
         <location filename="../preview/TemplatePreview.cpp"/>
@@ -2856,6 +2831,31 @@
         <location filename="../preview/TemplatePreview.cpp"/>
         <source>the template file cannot be written for its preview: %1</source>
         <translation>プレビューのためにテンプレートファイルを書き込めません: %1</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateVariables.cpp"/>
+        <source>A name without blanks at its ends was expected.</source>
+        <translation>前後に空白のない名前が必要です。</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateVariables.cpp"/>
+        <source>A name without &lt; and &gt; was expected.</source>
+        <translation>&lt; と &gt; を含まない名前が必要です。</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateVariables.cpp"/>
+        <source>"%1" cannot be the name of a variable: it has a meaning of its own.</source>
+        <translation>"%1" は変数ではありません。特別な意味を持つ名前です。</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateVariables.cpp"/>
+        <source>There is already a variable "%1".</source>
+        <translation>変数 "%1" は既にあります。</translation>
+    </message>
+    <message>
+        <location filename="../preview/TemplateVariables.cpp"/>
+        <source>Put the cursor on a variable first: in a field, a sort key or a dictionary.</source>
+        <translation>先に、フィールド、並べ替えキーまたは辞書の変数にカーソルを置いてください。</translation>
     </message>
     <message>
         <location filename="../apps/kareport/CheckCommand.cpp"/>
@@ -3909,6 +3909,21 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>Ser&amp;ver...</source>
+        <translation>サーバー(&amp;V)...</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>Choose a table of a database server</source>
+        <translation>データベースサーバーのテーブルを選択</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
+        <source>Tables of a PostgreSQL server</source>
+        <translation>PostgreSQL サーバーのテーブル</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>&amp;File:</source>
         <translation>ファイル(&amp;F):</translation>
     </message>
@@ -3936,6 +3951,11 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/TemplateDialog.cpp"/>
         <source>Data (*.csv *.txt *.xml *.landxml *.gpkg *.sqlite *.db);;All files (*)</source>
         <translation>データ (*.csv *.txt *.xml *.landxml *.gpkg *.sqlite *.db);;すべてのファイル (*)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/TemplateDialogFiles.cpp"/>
+        <source>Press Server to list the tables of this connection.</source>
+        <translation>「サーバー」を押すと、この接続のテーブルが一覧表示されます。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/TemplateDialogFiles.cpp"/>
@@ -4378,6 +4398,11 @@ Open them again?</source>
         <translation>ライセンス(&amp;L)</translation>
     </message>
     <message>
+        <location filename="../apps/kareport-desk/help/GuideBrowser.cpp"/>
+        <source>Guide</source>
+        <translation>手引き</translation>
+    </message>
+    <message>
         <location filename="../apps/kareport-desk/help/GuidePages.cpp"/>
         <source>Working with KaReport</source>
         <translation>KaReport の使い方</translation>
@@ -4434,11 +4459,6 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/help/HelpWindow.cpp"/>
-        <source>Guide</source>
-        <translation>手引き</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/help/HelpWindow.cpp"/>
         <source>Back</source>
         <translation>戻る</translation>
     </message>
@@ -4463,132 +4483,137 @@ Open them again?</source>
         <translation>このページにはありません</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportDatabase.cpp"/>
+        <source>the table was not read. Choose it again to read it</source>
+        <translation>テーブルは読み込まれませんでした。読み込むにはもう一度選択してください</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Comma</source>
         <translation>コンマ</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Semicolon</source>
         <translation>セミコロン</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Tab</source>
         <translation>タブ</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Vertical bar</source>
         <translation>縦線</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Blanks and tabs</source>
         <translation>空白とタブ</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Point: 1.5</source>
         <translation>ピリオド: 1.5</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Comma: 1,5</source>
         <translation>コンマ: 1,5</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>First &amp;row names the columns</source>
         <translation>先頭行は列名(&amp;R)</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Tabl&amp;e:</source>
         <translation>テーブル(&amp;E):</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Table of the database</source>
         <translation>データベースのテーブル</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Deli&amp;miter:</source>
         <translation>区切り文字(&amp;M):</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Delimiter</source>
         <translation>区切り文字</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Decimal s&amp;ign:</source>
         <translation>小数点(&amp;I):</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Decimal sign</source>
         <translation>小数点</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>En&amp;coding:</source>
         <translation>文字コード(&amp;C):</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Encoding</source>
         <translation>文字コード</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>&amp;Order:</source>
         <translation>順序(&amp;O):</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Order of the columns</source>
         <translation>列の順序</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>&amp;Lengths are:</source>
         <translation>長さの単位(&amp;L):</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Unit of lengths in the data</source>
         <translation>データの長さの単位</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>&amp;Areas are:</source>
         <translation>面積の単位(&amp;A):</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Unit of areas in the data</source>
         <translation>データの面積の単位</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>A&amp;ngles are:</source>
         <translation>角度の単位(&amp;N):</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>Unit of angles in the data</source>
         <translation>データの角度の単位</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>First row names the columns</source>
         <translation>先頭行は列名</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <location filename="../apps/kareport-desk/import/ImportFields.cpp"/>
         <source>P number, N northing, E easting, Z elevation, D description, - not read</source>
         <translation>P 番号、N 北座標、E 東座標、Z 標高、D 説明、- 読み込まない</translation>
     </message>
@@ -4599,11 +4624,6 @@ Open them again?</source>
     </message>
     <message>
         <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
-        <source>the database has no table</source>
-        <translation>データベースにテーブルがありません</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
         <source>Database</source>
         <translation>データベース</translation>
     </message>
@@ -4611,6 +4631,11 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
         <source>Text file</source>
         <translation>テキストファイル</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
+        <source>the database has no table</source>
+        <translation>データベースにテーブルがありません</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/import/ImportPanel.cpp"/>
@@ -4626,6 +4651,101 @@ Open them again?</source>
         <location filename="../apps/kareport-desk/import/ImportPanelRows.cpp"/>
         <source>Variable of the column %1</source>
         <translation>列 %1 の変数</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>Tables of a PostgreSQL Server</source>
+        <translation>PostgreSQL サーバーのテーブル</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>&amp;Service:</source>
+        <translation>サービス(&amp;S):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>Service</source>
+        <translation>サービス</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>an entry of ~/.pg_service.conf, or the fields below</source>
+        <translation>~/.pg_service.conf の項目、または下の各欄</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>&amp;Host:</source>
+        <translation>ホスト(&amp;H):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>Host</source>
+        <translation>ホスト</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>&amp;Port:</source>
+        <translation>ポート(&amp;P):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>Port</source>
+        <translation>ポート</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>&amp;Database:</source>
+        <translation>データベース(&amp;D):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>&amp;User:</source>
+        <translation>ユーザー(&amp;U):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>User</source>
+        <translation>ユーザー</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>&amp;More:</source>
+        <translation>その他(&amp;M):</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>More of the connection</source>
+        <translation>接続のその他の項目</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>A password is read from your password file (~/.pgpass) or from PGPASSWORD. It is part of no job.</source>
+        <translation>パスワードはパスワードファイル (~/.pgpass) または PGPASSWORD から読み込まれます。ジョブには含まれません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>Why there are no tables</source>
+        <translation>テーブルがない理由</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>&amp;List Tables</source>
+        <translation>テーブルを一覧表示(&amp;L)</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>Listing the tables of the server</source>
+        <translation>サーバーのテーブルを一覧表示しています</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>The server was not waited for.</source>
+        <translation>サーバーの応答を待たずに中止しました。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/import/ServerDialog.cpp"/>
+        <source>The database has no table that this user may read.</source>
+        <translation>このデータベースには、このユーザーが読み取れるテーブルがありません。</translation>
     </message>
     <message>
         <location filename="../apps/kareport-desk/main.cpp"/>
@@ -4653,17 +4773,17 @@ Open them again?</source>
         <translation>「%1」は作成し直されませんでした: %2</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
+        <location filename="../apps/kareport-desk/run/DeskRunsFiles.cpp"/>
         <source>Files of "%1" have changed. Press F5 to make it again.</source>
         <translation>「%1」の元のファイルが変更されました。F5 で作成し直します。</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
+        <location filename="../apps/kareport-desk/run/DeskRunsFiles.cpp"/>
         <source>Jobs</source>
         <translation>ジョブ</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/run/DeskRuns.cpp"/>
+        <location filename="../apps/kareport-desk/run/DeskRunsFiles.cpp"/>
         <source>The job was saved as "%1".</source>
         <translation>ジョブを「%1」として保存しました。</translation>
     </message>
@@ -5034,72 +5154,92 @@ Open them again?</source>
         <translation>ページの状態</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
+        <source>The template can only be read: it has characters that cannot be shown here.</source>
+        <translation>テンプレートは読み取り専用です: ここでは表示できない文字が含まれています。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
+        <source>The template has no changes that are not saved.</source>
+        <translation>テンプレートに未保存の変更はありません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>Save &amp;As...	Ctrl+Shift+S</source>
         <translation>名前を付けて保存(&amp;A)...	Ctrl+Shift+S</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>Choose &amp;Data...	Ctrl+D</source>
         <translation>データを選択(&amp;D)...	Ctrl+D</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>&amp;Close	Ctrl+W</source>
         <translation>閉じる(&amp;C)	Ctrl+W</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
-        <source>&amp;Find and Replace...	Ctrl+F</source>
-        <translation>検索と置換(&amp;F)...	Ctrl+F</translation>
-    </message>
-    <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>C&amp;omplete	Ctrl+Space</source>
         <translation>補完(&amp;O)	Ctrl+Space</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>Rena&amp;me Variable...	F2</source>
         <translation>変数名の変更(&amp;M)...	F2</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
+        <source>No text has been looked for yet.</source>
+        <translation>まだテキストを検索していません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
+        <source>&amp;Find and Replace...	Ctrl+F</source>
+        <translation>検索と置換(&amp;F)...	Ctrl+F</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>&amp;Insert</source>
         <translation>挿入(&amp;I)</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>&amp;Field	Ctrl+Shift+F</source>
         <translation>フィールド(&amp;F)	Ctrl+Shift+F</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>&amp;Table	Ctrl+Shift+T</source>
         <translation>表(&amp;T)	Ctrl+Shift+T</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>&amp;Block	Ctrl+Shift+B</source>
         <translation>ブロック(&amp;B)	Ctrl+Shift+B</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>&amp;Dictionary	Ctrl+Shift+D</source>
         <translation>辞書(&amp;D)	Ctrl+Shift+D</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
+        <source>There are no remarks on the template.</source>
+        <translation>テンプレートへの指摘はありません。</translation>
+    </message>
+    <message>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>&amp;Next Remark	F8</source>
         <translation>次の指摘(&amp;N)	F8</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>&amp;Previous Remark	Shift+F8</source>
         <translation>前の指摘(&amp;P)	Shift+F8</translation>
     </message>
     <message>
-        <location filename="../apps/kareport-desk/templates/TemplateWindowLayout.cpp"/>
+        <location filename="../apps/kareport-desk/templates/TemplateWindowMenus.cpp"/>
         <source>Text, &amp;Pages, Remarks	F6</source>
         <translation>テキスト、ページ、指摘(&amp;P)	F6</translation>
     </message>

@@ -156,6 +156,10 @@ void DeskFrame::closeEvent(QCloseEvent *event)
         kareport::noteExitCancelled();
         return;
     }
+    QStringList open; // comes before the reports: the one in front is the last
+    for (const kareport::OpenTemplateFile &file : kareport::openTemplates()) {
+        open.append(file.path);
+    }
     if (!kareport::closeTemplateEditors()) {
         event->ignore();
         kareport::noteExitCancelled();
@@ -175,7 +179,7 @@ void DeskFrame::closeEvent(QCloseEvent *event)
             return;
         }
     }
-    kareport::keepSession(openFiles());
+    kareport::keepSession(open + openFiles());
     UApplication::Get()->CloseAllDocuments();
     saveLayout();
     event->accept();

@@ -1,5 +1,6 @@
 #include "DeskFrame.h"
 
+#include "CommandButton.h"
 #include "DeskCommandIds.h"
 #include "DeskIcons.h"
 #include "DeskPreferences.h"
@@ -146,16 +147,7 @@ void DeskFrame::makeToolBar()
             toolBar_->addSeparator();
             continue;
         }
-        QAction *action = CommandAction(id);
-        toolBar_->addAction(action);
-        QString name = action->text();
-        name.remove(u'&');
-        while (name.endsWith(u'.')) {
-            name.chop(1);
-        }
-        const QString key = action->shortcut().toString(QKeySequence::NativeText);
-        action->setToolTip(key.isEmpty() ? name : name + QStringLiteral(" (") + key + u')');
-        toolBar_->widgetForAction(action)->setAccessibleName(name);
+        addCommandButton(*toolBar_, *CommandAction(id));
     }
 }
 

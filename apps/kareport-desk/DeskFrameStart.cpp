@@ -109,6 +109,9 @@ void DeskFrame::RestoreSession()
             OpenFile(file);
         }
     }
+    if (GetCommandDocument() != nullptr) {
+        activateWindow(); // the editors of templates are windows of their own
+    }
 }
 
 QString DeskFrame::OriginFile(const UDocument *report) const
@@ -118,5 +121,5 @@ QString DeskFrame::OriginFile(const UDocument *report) const
         return {};
     }
     const auto *file = std::get_if<QString>(&recipe->origin);
-    return file != nullptr ? *file : std::get<kareport::TemplateJob>(recipe->origin).data;
+    return file != nullptr ? *file : std::get<kareport::TemplateJob>(recipe->origin).mainFile();
 }

@@ -6,6 +6,7 @@
 #include "OpenTemplate.h"
 #include "PlainWidgets.h"
 #include "Profile.h"
+#include "ServerDialog.h"
 #include "UXmlReportTpl.h"
 #include "Xlate.h"
 
@@ -21,6 +22,8 @@
 #include <QPushButton>
 #include <QVBoxLayout>
 
+#include <initializer_list>
+
 namespace kareport
 {
 
@@ -33,11 +36,13 @@ const QString outputEntry = QStringLiteral("Last Template Output");
 const QString dataEntry = QStringLiteral("Last Template Data");
 const QString landXmlEntry = QStringLiteral("Last Template List"); // as in a job
 
-QHBoxLayout *withButton(QLineEdit *field, QPushButton *button)
+QHBoxLayout *withButtons(QLineEdit *field, std::initializer_list<QPushButton *> buttons)
 {
     auto *row = new QHBoxLayout;
     row->addWidget(field, 1);
-    row->addWidget(button);
+    for (QPushButton *button : buttons) {
+        row->addWidget(button);
+    }
     return row;
 }
 
@@ -83,16 +88,19 @@ QLayout *TemplateDialog::makeForm()
     browseFile->setAccessibleName(Xlate("Choose a template file"));
     auto *browseData = new QPushButton(Xlate("Brow&se..."));
     browseData->setAccessibleName(Xlate("Choose a data file"));
+    auto *browseServer = new QPushButton(Xlate("Ser&ver..."));
+    browseServer->setAccessibleName(Xlate("Choose a table of a database server"));
+    browseServer->setToolTip(Xlate("Tables of a PostgreSQL server"));
     auto *form = new QFormLayout;
     const auto addRow = [form](const QString &text, QWidget *buddy, auto *row) {
         auto *label = plainLabel(text);
         label->setBuddy(buddy);
         form->addRow(label, row);
     };
-    addRow(Xlate("&File:"), file_, withButton(file_, browseFile));
+    addRow(Xlate("&File:"), file_, withButtons(file_, {browseFile}));
     addRow(Xlate("&Template:"), template_, template_);
     addRow(Xlate("Table or &block:"), output_, output_);
-    addRow(Xlate("&Data:"), data_, withButton(data_, browseData));
+    addRow(Xlate("&Data:"), data_, withButtons(data_, {browseData, browseServer}));
     landXml_.emplace(*form);
     connect(browseFile, &QPushButton::clicked, this,
             [this] { browse(*file_, Xlate("Choose a template file"), Xlate("Templates (*.xml);;All files (*)")); });
@@ -100,12 +108,17 @@ QLayout *TemplateDialog::makeForm()
         browse(*data_, Xlate("Choose a data file"),
                Xlate("Data (*.csv *.txt *.xml *.landxml *.gpkg *.sqlite *.db);;All files (*)"));
     });
+    connect(browseServer, &QPushButton::clicked, this, [this] { chooseServer(); });
     return form;
 }
 
 void TemplateDialog::followFields()
 {
     import_->setChangedHandler([this] { check(); });
+    askServer = [this](const QString &connection) -> std::optional<ServerTables> {
+        ServerDialog dialog(connection, this);
+        return dialog.exec() == QDialog::Accepted ? std::optional(dialog.tables()) : std::nullopt;
+    };
     connect(file_, &QLineEdit::textChanged, this, &TemplateDialog::readTemplates);
     connect(template_, &QComboBox::currentIndexChanged, this, &TemplateDialog::readOutputs);
     connect(output_, &QComboBox::currentIndexChanged, this, &TemplateDialog::useOutput);
@@ -136,12 +149,12 @@ TemplateJob TemplateDialog::job() const
     job.templateFile = QFileInfo(file_->text()).absoluteFilePath();
     job.templateName = template_->currentData().toString();
     (output_->currentData().toBool() ? job.block : job.table) = output_->currentText();
-    job.data = QFileInfo(data_->text()).absoluteFilePath();
+    job.data = isServer() ? connection_ : QFileInfo(data_->text()).absoluteFilePath();
     if (isLandXml_) {
         job.dataKind = QStringLiteral("landxml");
         job.dataOptions = landXml_->keys();
     } else {
-        job.dataKind = import_->isDatabase() ? QStringLiteral("sqlite") : job.dataKind;
+        job.dataKind = import_->dataKind();
         job.dataOptions = import_->options();
     }
     return job;

@@ -1,9 +1,11 @@
 #include "StandardText.h"
 #include "TemplateDialog.h"
 
+#include "ConnectionWords.h"
 #include "DictionaryVariables.h"
 #include "ImportGuess.h"
 #include "ImportPanel.h"
+#include "ServerDialog.h"
 #include "SqlitePreview.h"
 #include "TemplateNames.h"
 #include "TemplateSource.h"
@@ -22,6 +24,7 @@
 
 #include <algorithm>
 #include <new>
+#include <utility>
 
 namespace kareport
 {
@@ -89,34 +92,61 @@ void TemplateDialog::useOutput()
     check();
 }
 
-/// Finds out what kind of file the data file is.
+/// Shows what the data field names: a file, or a database server whose tables were listed.
 void TemplateDialog::readData()
 {
     isLandXml_ = false;
     wrongData_.clear();
-    const QString path = data_->text();
-    std::shared_ptr<const FileBytes> text;
-    bool isDatabase = false;
-    if (QFileInfo(path).isFile()) { // a pipe or a device might never end
-        const auto file = FileBytes::open(path);
-        if (const auto *opened = std::get_if<std::shared_ptr<const FileBytes>>(&file)) {
-            const bool isXml = isLandXml(*opened);
-            isLandXml_ = isXml && readContents(*opened);
-            isDatabase = isSqlite((*opened)->view());
-            text = isXml || isDatabase ? nullptr : beginOfText(*opened);
+    if (isServer()) {
+        import_->setDatabase(server_);
+    } else if (QFileInfo(data_->text()).isFile()) { // a pipe or a device might never end
+        readFile(data_->text());
+    } else {
+        import_->setFile(nullptr);
+        if (isLikeConnection(data_->text())) {
+            wrongData_ = Xlate("Press Server to list the tables of this connection.");
         }
     }
     if (!isLandXml_) {
         landXml_->clear();
     }
-    if (isDatabase) {
-        import_->setDatabase(QFileInfo(path).absoluteFilePath());
-    } else {
-        import_->setFile(text);
-    }
     check();
     layout()->activate();
     resize(width(), qMax(height(), sizeHint().height()));
+}
+
+void TemplateDialog::readFile(const QString &path)
+{
+    const auto file = FileBytes::open(path);
+    const auto *opened = std::get_if<std::shared_ptr<const FileBytes>>(&file);
+    if (opened != nullptr && isSqlite((*opened)->view())) {
+        import_->setDatabase(sqliteImport(QFileInfo(path).absoluteFilePath()));
+        return;
+    }
+    const bool isXml = opened != nullptr && isLandXml(*opened);
+    isLandXml_ = isXml && readContents(*opened);
+    import_->setFile(isXml || opened == nullptr ? nullptr : beginOfText(*opened));
+}
+
+/// Whether the data is that of a server whose tables are listed.
+bool TemplateDialog::isServer() const
+{
+    return server_ != nullptr && data_->text() == connection_;
+}
+
+void TemplateDialog::chooseServer()
+{
+    auto chosen = askServer(isLikeConnection(data_->text()) ? data_->text() : connection_);
+    if (!chosen) {
+        return;
+    }
+    connection_ = chosen->connection;
+    server_ = postgresImport(connection_, std::move(chosen->tables));
+    if (data_->text() == connection_) {
+        readData();
+    } else {
+        data_->setText(connection_);
+    }
 }
 
 /// Reads the names in a LandXML file. @return whether there is something to choose
@@ -156,11 +186,11 @@ void TemplateDialog::check()
     if (message.isEmpty() && template_->currentIndex() >= 0 && output_->count() == 0) {
         message = Xlate("This template has neither a table nor a block.");
     }
-    if (message.isEmpty() && !data_->text().isEmpty() && !QFileInfo(data_->text()).isFile()) {
-        message = Xlate("There is no data file \"%1\".").arg(data_->text());
-    }
     if (message.isEmpty()) {
         message = wrongData_;
+    }
+    if (message.isEmpty() && !isServer() && !data_->text().isEmpty() && !QFileInfo(data_->text()).isFile()) {
+        message = Xlate("There is no data file \"%1\".").arg(data_->text());
     }
     const bool canRun = message.isEmpty();
     if (message.isEmpty()) {

@@ -3,6 +3,7 @@
 #include "PrintQt.h"
 #include "TemplateCheck.h"
 #include "TemplateFile.h"
+#include "TextDifference.h"
 
 #include <QFile>
 
@@ -117,7 +118,7 @@ TEST(TemplateEdits, RenamingAVariableRenamesItsUsesAndNothingElse)
 {
     const QString text = survey();
     const qsizetype at = text.indexOf(QStringLiteral("<Sort><VariableName>Number")) + 22;
-    const auto use = kareport::variableAt(text, at);
+    const auto use = kareport::variableAt(outlineOf(text), at);
     ASSERT_TRUE(use);
     EXPECT_EQ(use->name, QStringLiteral("Number"));
     const EditedTemplate edited = withRenamedVariable(text, at, QStringLiteral("PointNo"));

@@ -21,6 +21,7 @@
 #include "ReportEdit.h"
 #include "ReportPrinter.h"
 #include "ReportViewWidget.h"
+#include "ServerDialog.h"
 #include "SheetReportView.h"
 #include "TemplateDialog.h"
 #include "TemplateFindBar.h"
@@ -202,6 +203,23 @@ void takeDesk(Pictures &pictures, const QString &examples)
     }
 }
 
+/// Several report windows that are kept.
+void takeReportWindows(Pictures &pictures, const QString &examples)
+{
+    DeskApplication application;
+    DeskFrame frame;
+    frame.resize(1000, 760);
+    frame.OnCommand(kareport::keepReportWindowCommand);
+    for (const char *name : {"control-metric.json", "traverse-gon.json", "stakeout.json"}) {
+        frame.OpenFile(QDir(examples).filePath(QString::fromLatin1(name)));
+    }
+    pictures.take(frame, "report-windows");
+    frame.OnCommand(kareport::keepReportWindowCommand);
+    for (UDocument *document : application.GetDocTemplates().front()->GetDocuments()) {
+        document->SetModifiedFlag(false);
+    }
+}
+
 /// The editor of a template: as it is opened, with what can be written, and with a text that is broken.
 void takeTemplateEditor(Pictures &pictures, const QString &examples)
 {
@@ -224,6 +242,10 @@ void takeTemplateEditor(Pictures &pictures, const QString &examples)
     window.findBar().open();
     window.findBar().field().setText(QStringLiteral("Northing"));
     pictures.take(window, "template-editor-broken");
+    window.updateCommands();
+    kareport::CommandList list(kareport::listedCommands(*window.menuBar()), &window);
+    list.findChild<QLineEdit *>()->setText(QStringLiteral("insert"));
+    pictures.take(list, "template-editor-commands");
     window.edit().document()->setModified(false);
     window.close();
 }
@@ -311,6 +333,8 @@ void takeDialogs(Pictures &pictures, const QString &examples)
     choose("Alignment", "RR-1");
     choose("Surface", "ground");
     pictures.take(fromTemplate, "template-landxml");
+    kareport::ServerDialog server(QStringLiteral("host=data.example dbname=survey user=anna sslmode=require"));
+    pictures.take(server, "server");
     kareport::PageSetup setup;
     setup.margins = kareport::defaultMargins;
     kareport::fillPrinters(setup);
@@ -349,6 +373,7 @@ int main(int argc, char **argv)
     QDir().mkpath(folder);
     Pictures pictures(folder, parser.value(suffix));
     takeDesk(pictures, parser.value(examples));
+    takeReportWindows(pictures, parser.value(examples));
     takeTemplateEditor(pictures, parser.value(examples));
     takeNotes(pictures, parser.value(examples));
     takeDialogs(pictures, parser.value(examples));

@@ -25,7 +25,7 @@ bool CommandTips::eventFilter(QObject *watched, QEvent *event)
     if (event->type() == QEvent::MouseMove) {
         const auto *menu = qobject_cast<const QMenu *>(watched);
         const QAction *action =
-            menu != nullptr ? menu->actionAt(static_cast<QMouseEvent *>(event)->position().toPoint()) : nullptr;
+            belongsTo(menu, frame_) ? menu->actionAt(static_cast<QMouseEvent *>(event)->position().toPoint()) : nullptr;
         if (action != nullptr && !action->isEnabled() && !action->statusTip().isEmpty()) {
             frame_.statusBar()->showMessage(action->statusTip());
         }
@@ -35,7 +35,7 @@ bool CommandTips::eventFilter(QObject *watched, QEvent *event)
         const auto *widget = qobject_cast<const QWidget *>(watched);
         const bool isCommand = key->modifiers().testAnyFlags(Qt::ControlModifier | Qt::AltModifier) ||
                                (key->key() >= Qt::Key_F1 && key->key() <= Qt::Key_F35);
-        if (isCommand && widget != nullptr && holdsPanes(widget->window(), &frame_)) {
+        if (isCommand && belongsTo(widget, frame_) && holdsPanes(widget->window(), &frame_)) {
             update_();
         }
     }

@@ -1,6 +1,5 @@
 #include "HelpWindow.h"
 
-#include "DeskPreferences.h"
 #include "GuidePages.h"
 #include "LineIcon.h"
 #include "PaneWindows.h"
@@ -12,17 +11,13 @@
 
 #include <QApplication>
 #include <QHBoxLayout>
-#include <QImage>
 #include <QKeyEvent>
 #include <QLabel>
 #include <QLineEdit>
 #include <QListWidget>
-#include <QLocale>
 #include <QPainter>
 #include <QShortcut>
 #include <QSplitter>
-#include <QTextFrame>
-#include <QTextTable>
 #include <QToolButton>
 #include <QVBoxLayout>
 
@@ -33,13 +28,6 @@ namespace
 {
 
 constexpr int pageRole = Qt::UserRole;
-
-/// The language that the guides are to be in.
-QString guideLanguage()
-{
-    const QString chosen = loadPreferences().language;
-    return chosen.isEmpty() ? QLocale::system().name() : chosen;
-}
 
 QIcon arrowIcon(bool back)
 {
@@ -59,73 +47,7 @@ QToolButton *newButton(const QIcon &icon, const QString &name, const QKeySequenc
     return button;
 }
 
-/// Tables get lines and room in their cells, which text with marks does not give them.
-void dressTables(QTextFrame &frame, const QColor &line)
-{
-    for (QTextFrame *child : frame.childFrames()) {
-        if (auto *table = qobject_cast<QTextTable *>(child)) {
-            QTextTableFormat format = table->format();
-            format.setBorder(1);
-            format.setBorderStyle(QTextFrameFormat::BorderStyle_Solid);
-            format.setBorderCollapse(true);
-            format.setBorderBrush(line);
-            format.setCellPadding(4);
-            table->setFormat(format);
-        }
-        dressTables(*child, line);
-    }
-}
-
 } // namespace
-
-GuideBrowser::GuideBrowser(QWidget *parent) : QTextBrowser(parent)
-{
-    setOpenExternalLinks(true);
-    setAccessibleName(Xlate("Guide"));
-    constexpr qreal room = 16;
-    document()->setDocumentMargin(room);
-    connect(this, &QTextBrowser::sourceChanged, this, &GuideBrowser::dress);
-}
-
-QVariant GuideBrowser::loadResource(int type, const QUrl &name)
-{
-    const QVariant loaded = QTextBrowser::loadResource(type, name);
-    if (type != QTextDocument::ImageResource || name.scheme() != u"qrc") {
-        return loaded;
-    }
-    // A picture is not wider than the page. One of a kind that cannot be drawn here leaves no mark.
-    const QImage picture(u':' + name.path());
-    if (picture.isNull()) {
-        return QPixmap(1, 1);
-    }
-    const int room = viewport()->width() - qRound(2 * document()->documentMargin()) - 8;
-    return picture.width() > room && room > 0 ? QVariant(picture.scaledToWidth(room, Qt::SmoothTransformation))
-                                              : QVariant(picture);
-}
-
-void GuideBrowser::doSetSource(const QUrl &name, QTextDocument::ResourceType type)
-{
-    if (!name.fileName().endsWith(u".md") || (!name.scheme().isEmpty() && name.scheme() != u"qrc")) {
-        QTextBrowser::doSetSource(name, type);
-        return;
-    }
-    // Links name pages by where they are among the sources.
-    const QString file = guideFile(name.fileName(), guideLanguage());
-    if (!file.isEmpty()) {
-        QUrl page(QStringLiteral("qrc") + file);
-        page.setFragment(name.fragment());
-        QTextBrowser::doSetSource(page, QTextDocument::MarkdownResource);
-    }
-}
-
-void GuideBrowser::dress(const QUrl &name)
-{
-    nameHeadings(*document());
-    dressTables(*document()->rootFrame(), quietColor(palette(), QPalette::Base));
-    if (name.hasFragment()) {
-        scrollToAnchor(name.fragment());
-    }
-}
 
 HelpWindow::HelpWindow(QWidget *parent)
     : QDialog(parent),

@@ -1,7 +1,8 @@
 #pragma once
 
+#include "GuideBrowser.h"
+
 #include <QDialog>
-#include <QTextBrowser>
 
 class QLabel;
 class QLineEdit;
@@ -10,22 +11,6 @@ class QToolButton;
 
 namespace kareport
 {
-
-/// Shows a page of the guides. Links lead to other pages and to headings; pictures are those of the guides.
-class GuideBrowser : public QTextBrowser
-{
-public:
-    explicit GuideBrowser(QWidget *parent = nullptr);
-
-    QVariant loadResource(int type, const QUrl &name) override;
-
-protected:
-    void doSetSource(const QUrl &name, QTextDocument::ResourceType type) override;
-
-private:
-    /// Gives a page that was just loaded, also by going back, what its text does not have: names of headings, lines of tables.
-    void dress(const QUrl &name);
-};
 
 /// The guides of the program in a window beside the work: a list of the pages, the page, a way back, and a text to look for.
 class HelpWindow : public QDialog

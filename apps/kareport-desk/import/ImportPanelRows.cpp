@@ -54,6 +54,7 @@ void ImportPanel::showColumns()
         auto *box = qobject_cast<QComboBox *>(table_->cellWidget(0, column));
         if (box == nullptr) {
             box = new QComboBox;
+            box->setSizeAdjustPolicy(QComboBox::AdjustToContents);
             table_->setCellWidget(0, column, box);
             connect(box, &QComboBox::currentIndexChanged, this, [this, box, column] {
                 if (!isFilling_) {
@@ -95,7 +96,8 @@ void ImportPanel::showRows()
     for (int column = 0; column < table_->columnCount(); ++column) {
         // A box in a cell is not content of its column.
         if (const QWidget *box = table_->cellWidget(0, column)) {
-            table_->setColumnWidth(column, std::max(table_->columnWidth(column), box->sizeHint().width()));
+            const int room = box->fontMetrics().averageCharWidth(); // a box asks for a little less than its style draws
+            table_->setColumnWidth(column, std::max(table_->columnWidth(column), box->sizeHint().width() + room));
         }
     }
 }

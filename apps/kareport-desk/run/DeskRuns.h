@@ -101,6 +101,7 @@ private:
         bool isKept = false;     ///< the user has refused to give up his changes for those of the files
     };
 
+    static bool keptFollowsFiles();
     static TextState stateOf(const UReportDoc &report);
     UReportDoc *inFront() const;
     Made *madeOf(const UDocument *report);

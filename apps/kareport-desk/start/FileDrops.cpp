@@ -31,13 +31,19 @@ FileDrops::FileDrops(QWidget &frame, std::function<void(const QStringList &files
     qApp->installEventFilter(this);
 }
 
+/// Whether a window is the frame, or one in which its panes float.
+bool FileDrops::isOne(const QWidget *window) const
+{
+    return belongsTo(window, frame_) && holdsPanes(window, &frame_);
+}
+
 bool FileDrops::eventFilter(QObject *watched, QEvent *event)
 {
     const auto type = event->type();
     if (type == QEvent::ParentChange || type == QEvent::Show) {
         // A pane that floats is a window of its own.
         auto *widget = qobject_cast<QWidget *>(watched);
-        if (widget != nullptr && widget->isWindow() && widget != &frame_ && holdsPanes(widget, &frame_)) {
+        if (widget != nullptr && widget->isWindow() && widget != &frame_ && isOne(widget)) {
             widget->setAcceptDrops(true);
         }
         return false;
@@ -47,7 +53,7 @@ bool FileDrops::eventFilter(QObject *watched, QEvent *event)
     }
     auto *widget = qobject_cast<QWidget *>(watched);
     auto *drag = static_cast<QDropEvent *>(event);
-    if (widget == nullptr || !holdsPanes(widget->window(), &frame_) || drag->mimeData() == nullptr) {
+    if (widget == nullptr || !isOne(widget->window()) || drag->mimeData() == nullptr) {
         return false;
     }
     const QStringList files = droppedFiles(*drag->mimeData());

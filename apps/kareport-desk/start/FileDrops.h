@@ -24,6 +24,8 @@ public:
     bool eventFilter(QObject *watched, QEvent *event) override;
 
 private:
+    bool isOne(const QWidget *window) const;
+
     QWidget &frame_;
     std::function<void(const QStringList &files)> drop_;
 };

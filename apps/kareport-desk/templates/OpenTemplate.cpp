@@ -9,7 +9,6 @@
 #include <QPointer>
 
 #include <algorithm>
-#include <vector>
 
 namespace kareport
 {
@@ -70,6 +69,17 @@ bool openTemplateAt(const QString &path, qsizetype line, qsizetype column)
         window->goTo(line, std::max<qsizetype>(column, 1));
     }
     return true;
+}
+
+std::vector<OpenTemplateFile> openTemplates()
+{
+    std::vector<OpenTemplateFile> open;
+    for (const auto &window : windows()) {
+        if (window->isVisible()) { // one that was closed goes a moment later
+            open.push_back({window->path(), window->isWindowModified()});
+        }
+    }
+    return open;
 }
 
 bool closeTemplateEditors()

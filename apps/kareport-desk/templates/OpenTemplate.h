@@ -3,6 +3,7 @@
 #include <QString>
 
 #include <functional>
+#include <vector>
 
 namespace kareport
 {
@@ -12,6 +13,15 @@ namespace kareport
 /// @param line, column  where the cursor goes, both from 1; 0 leaves it where it is
 /// @return false, after a message, when the file cannot be read
 bool openTemplateAt(const QString &path, qsizetype line = 0, qsizetype column = 0);
+
+/// A template that is open in an editor.
+struct OpenTemplateFile
+{
+    QString path;
+    bool isModified = false; ///< it has changes that are not saved
+};
+/// All of them, in the order in which they were opened.
+std::vector<OpenTemplateFile> openTemplates();
 
 /// Closes all editors of templates. Each asks about its unsaved changes. @return false when the user has kept one open
 bool closeTemplateEditors();

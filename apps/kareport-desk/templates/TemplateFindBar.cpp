@@ -46,8 +46,10 @@ TemplateFindBar::TemplateFindBar(TemplateTextEdit &edit, QWidget *parent)
     grid->addWidget(button(Xlate("&Previous"), [this] { findPrevious(); }), 0, 2);
     grid->addWidget(matchCase_, 0, 3);
     grid->addWidget(replacement_, 1, 0);
-    grid->addWidget(button(Xlate("&Replace"), [this] { replace(); }), 1, 1);
-    grid->addWidget(button(Xlate("Replace &All"), [this] { replaceAll(); }), 1, 2);
+    replaces_ = {button(Xlate("&Replace"), [this] { replace(); }),
+                 button(Xlate("Replace &All"), [this] { replaceAll(); })};
+    grid->addWidget(replaces_[0], 1, 1);
+    grid->addWidget(replaces_[1], 1, 2);
     grid->addWidget(count_, 1, 3);
     grid->setColumnStretch(0, 1);
     connect(field_, &QLineEdit::textChanged, this, [this] { showMatches(); });
@@ -59,6 +61,10 @@ TemplateFindBar::TemplateFindBar(TemplateTextEdit &edit, QWidget *parent)
 void TemplateFindBar::open()
 {
     const QString selected = edit_.textCursor().selectedText();
+    for (QPushButton *button : replaces_) {
+        button->setEnabled(!edit_.isReadOnly());
+    }
+    replacement_->setEnabled(!edit_.isReadOnly());
     show();
     if (!selected.isEmpty() && !selected.contains(QChar::ParagraphSeparator)) {
         field_->setText(selected);
@@ -158,6 +164,9 @@ bool TemplateFindBar::findPrevious()
 
 void TemplateFindBar::replace()
 {
+    if (edit_.isReadOnly()) {
+        return;
+    }
     for (const TextRange &match : matches()) {
         if (isSelected(match)) {
             edit_.textCursor().insertText(replacement_->text());
@@ -169,6 +178,9 @@ void TemplateFindBar::replace()
 
 void TemplateFindBar::replaceAll()
 {
+    if (edit_.isReadOnly()) {
+        return;
+    }
     QString text = edit_.wholeText();
     const std::vector<TextRange> found = matches();
     for (auto match = found.rbegin(); match != found.rend(); ++match) {

@@ -4,6 +4,7 @@
 
 #include <QWidget>
 
+#include <array>
 #include <vector>
 
 class QCheckBox;
@@ -54,6 +55,7 @@ private:
     QLineEdit *replacement_;
     QCheckBox *matchCase_;
     QLabel *count_;
+    std::array<QPushButton *, 2> replaces_{}; ///< which need a text that can be edited
 };
 
 } // namespace kareport

@@ -1,8 +1,8 @@
 #include "TemplateTextEdit.h"
 
 #include "PlainWidgets.h"
-#include "TemplateEdits.h"
 #include "TemplateHighlighter.h"
+#include "TextDifference.h"
 #include "Xlate.h"
 
 #include <QAbstractItemView>

@@ -1,12 +1,15 @@
 #include "TemplateWindow.h"
 
 #include "AppMessageBox.h"
+#include "FileDrops.h"
 #include "PlainWidgets.h"
 #include "TemplateFindBar.h"
 #include "TemplatePage.h"
 #include "TemplateTextEdit.h"
+#include "TextDifference.h"
 #include "Xlate.h"
 
+#include <QApplication>
 #include <QComboBox>
 #include <QLabel>
 #include <QStatusBar>
@@ -61,6 +64,7 @@ TemplateWindow::TemplateWindow()
     makeDialogs();
     makeBody();
     makeMenus();
+    new FileDrops(*this, [this](const QStringList &files) { takeDropped(files); });
     constexpr int workingAfter = 60; // milliseconds: what takes longer is said
     workingTimer_.setSingleShot(true);
     workingTimer_.setInterval(workingAfter);
@@ -84,8 +88,10 @@ TemplateWindow::TemplateWindow()
 
 TemplateWindow::~TemplateWindow()
 {
-    // The texts tell of changes until they are gone.
+    // The texts tell of changes until they are gone, and the program of the keyboard.
     edit_->disconnect(this);
+    page_->disconnect(this);
+    qApp->disconnect(this);
     worker_.reset();
 }
 
@@ -264,10 +270,9 @@ void TemplateWindow::renameVariable()
 {
     const QString text = edit_->wholeText();
     const qsizetype position = edit_->textCursor().position();
-    const auto use = variableAt(text, position);
+    const auto use = variableAt(*outline_, position);
     if (!use) {
-        AppMessageBox(Xlate("Put the cursor on a variable first: in a field, a sort key or a dictionary."));
-        return;
+        return; // the command is disabled then
     }
     if (const auto name = askNewName(use->name); name && *name != use->name) {
         carryOut(withRenamedVariable(text, position, *name));

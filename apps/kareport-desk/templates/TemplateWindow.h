@@ -15,10 +15,14 @@
 #include <functional>
 #include <memory>
 #include <optional>
+#include <vector>
 
+class QAction;
 class QComboBox;
 class QLabel;
 class QMenu;
+class QPlainTextEdit;
+class QToolBar;
 class QTreeWidget;
 
 namespace kareport
@@ -49,6 +53,8 @@ public:
     bool arePagesUpToDate() const { return shown_ == requested_; }
     /// The same of the remarks as well.
     bool isUpToDate() const { return arePagesUpToDate() && checked_ == requested_; }
+    /// Brings the states of all commands up to date, and the reasons of those that cannot act.
+    void updateCommands();
 
     TemplateTextEdit &edit() const { return *edit_; }
     TemplatePage &page() const { return *page_; }
@@ -67,12 +73,27 @@ protected:
     void closeEvent(QCloseEvent *event) override;
 
 private:
+    struct WindowCommand
+    {
+        QAction *action;
+        std::function<QString()> whyNot; ///< what keeps it from acting, as a sentence; null for what can always act
+    };
+
     // TemplateWindowLayout.cpp
     void makeDialogs();
     void makeBody();
     QWidget *makeTextHalf();
     QWidget *makePageHalf();
+
+    // TemplateWindowMenus.cpp
     void makeMenus();
+    void addHelpMenu();
+    void addFindCommands(QMenu &menu);
+    void addCommand(QMenu &menu, const QString &text, std::function<void()> act, std::function<QString()> whyNot = {},
+                    unsigned likeCommand = 0);
+    void chooseCommand();
+    QPlainTextEdit &readPart() const;
+    QString whyNoEdit() const;
     void addFileMenu();
     void addEditMenu();
     void addInsertMenu();
@@ -89,6 +110,7 @@ private:
     void fillDataChoice();
     void chooseData(int index);
     void browseData();
+    void takeDropped(const QStringList &files);
     TemplateData dataOfFile(const QString &file) const;
 
     void textChanged();
@@ -123,11 +145,13 @@ private:
     QLabel *place_ = nullptr;
     QLabel *templateName_ = nullptr;
     QComboBox *dataChoice_ = nullptr;
+    QToolBar *toolBar_ = nullptr;
     QTimer workingTimer_;
     FileWatch watch_;
     FileWatch dataWatch_;
     QString messageText_;
     std::unique_ptr<PreviewWorker> worker_;
+    std::vector<WindowCommand> commands_;
 };
 
 } // namespace kareport

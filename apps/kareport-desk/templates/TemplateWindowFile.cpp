@@ -2,6 +2,7 @@
 #include "AppMessageBox.h"
 #include "ChangedFile.h"
 #include "FileKind.h"
+#include "OpenTemplate.h"
 #include "ReplaceFile.h"
 #include "TemplatePage.h"
 #include "TemplateSource.h"
@@ -186,6 +187,19 @@ void TemplateWindow::browseData()
         setData(dataOfFile(*file));
     }
     fillDataChoice();
+}
+
+/// Rows of a text file are shown on the pages; any other file is opened.
+void TemplateWindow::takeDropped(const QStringList &files)
+{
+    for (const QString &file : files) {
+        const QString ending = QFileInfo(file).suffix().toLower();
+        if (ending == u"csv" || ending == u"txt") {
+            setData(dataOfFile(file));
+        } else {
+            openAnyFile(file);
+        }
+    }
 }
 
 /// A data file is written through the table or block that the cursor is in, or else through the template's first one.

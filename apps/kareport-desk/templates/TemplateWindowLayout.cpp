@@ -1,6 +1,5 @@
 // What the window of a template consists of.
 #include "Folders.h"
-#include "OpenTemplate.h"
 #include "PlainWidgets.h"
 #include "ReportEntry.h"
 #include "TemplateFindBar.h"
@@ -9,7 +8,6 @@
 #include "TemplateWindow.h"
 #include "Xlate.h"
 
-#include <QAction>
 #include <QComboBox>
 #include <QDialog>
 #include <QDialogButtonBox>
@@ -20,8 +18,6 @@
 #include <QHeaderView>
 #include <QLabel>
 #include <QLineEdit>
-#include <QMenu>
-#include <QMenuBar>
 #include <QScreen>
 #include <QSplitter>
 #include <QStatusBar>
@@ -33,19 +29,6 @@ namespace kareport
 
 namespace
 {
-
-/// Adds a command to a menu. What follows a tab in the text is its key.
-template <typename Act>
-QAction *addCommand(QWidget &window, QMenu &menu, const QString &text, Act act)
-{
-    const QStringList parts = text.split(u'\t');
-    QAction *action = menu.addAction(parts.first());
-    if (parts.size() > 1) {
-        action->setShortcut(QKeySequence(parts.last()));
-    }
-    QObject::connect(action, &QAction::triggered, &window, act);
-    return action;
-}
 
 std::optional<QString> chosen(const QString &path)
 {
@@ -175,100 +158,6 @@ QWidget *TemplateWindow::makePageHalf()
     layout->addWidget(message_);
     layout->addWidget(page_, 1);
     return half;
-}
-
-void TemplateWindow::makeMenus()
-{
-    addFileMenu();
-    addEditMenu();
-    addInsertMenu();
-    addViewMenu();
-}
-
-void TemplateWindow::addFileMenu()
-{
-    QMenu &menu = *menuBar()->addMenu(Xlate("&File"));
-    addCommand(*this, menu, Xlate("&Open...\tCtrl+O"), [this] {
-        if (const auto path = askOpen()) {
-            openAnyFile(*path);
-        }
-    });
-    addCommand(*this, menu, Xlate("&Save\tCtrl+S"), [this] { save(); });
-    addCommand(*this, menu, Xlate("Save &As...\tCtrl+Shift+S"), [this] { saveAs(); });
-    menu.addSeparator();
-    addCommand(*this, menu, Xlate("Choose &Data...\tCtrl+D"), [this] { browseData(); });
-    menu.addSeparator();
-    addCommand(*this, menu, Xlate("&Close\tCtrl+W"), [this] { close(); });
-}
-
-void TemplateWindow::addEditMenu()
-{
-    QMenu &menu = *menuBar()->addMenu(Xlate("&Edit"));
-    QAction *undo = addCommand(*this, menu, Xlate("&Undo\tCtrl+Z"), [this] { edit_->undo(); });
-    QAction *redo = addCommand(*this, menu, Xlate("&Redo\tCtrl+Shift+Z"), [this] { edit_->redo(); });
-    undo->setEnabled(false);
-    redo->setEnabled(false);
-    connect(edit_, &QPlainTextEdit::undoAvailable, undo, &QAction::setEnabled);
-    connect(edit_, &QPlainTextEdit::redoAvailable, redo, &QAction::setEnabled);
-    menu.addSeparator();
-    QAction *cut = addCommand(*this, menu, Xlate("Cu&t\tCtrl+X"), [this] { edit_->cut(); });
-    QAction *copy = addCommand(*this, menu, Xlate("&Copy\tCtrl+C"),
-                               [this] { (page_->hasFocus() ? static_cast<QPlainTextEdit *>(page_) : edit_)->copy(); });
-    cut->setEnabled(false);
-    connect(edit_, &QPlainTextEdit::copyAvailable, cut, &QAction::setEnabled);
-    copy->setEnabled(true);
-    addCommand(*this, menu, Xlate("&Paste\tCtrl+V"), [this] { edit_->paste(); });
-    addCommand(*this, menu, Xlate("Select &All\tCtrl+A"),
-               [this] { (page_->hasFocus() ? static_cast<QPlainTextEdit *>(page_) : edit_)->selectAll(); });
-    menu.addSeparator();
-    addCommand(*this, menu, Xlate("&Find and Replace...\tCtrl+F"), [this] { findBar_->open(); });
-    addCommand(*this, menu, Xlate("Find &Next\tF3"), [this] { findBar_->findNext(); });
-    addCommand(*this, menu, Xlate("Find Pre&vious\tShift+F3"), [this] { findBar_->findPrevious(); });
-    menu.addSeparator();
-    addCommand(*this, menu, Xlate("C&omplete\tCtrl+Space"), [this] { edit_->complete(true); });
-    addCommand(*this, menu, Xlate("Rena&me Variable...\tF2"), [this] { renameVariable(); });
-}
-
-void TemplateWindow::addInsertMenu()
-{
-    QMenu &menu = *menuBar()->addMenu(Xlate("&Insert"));
-    const auto here = [this] { return static_cast<qsizetype>(edit_->textCursor().position()); };
-    addCommand(*this, menu, Xlate("&Field\tCtrl+Shift+F"),
-               [this, here] { carryOut(withField(edit_->wholeText(), here())); });
-    addCommand(*this, menu, Xlate("&Table\tCtrl+Shift+T"),
-               [this, here] { carryOut(withOutput(edit_->wholeText(), here(), true)); });
-    addCommand(*this, menu, Xlate("&Block\tCtrl+Shift+B"),
-               [this, here] { carryOut(withOutput(edit_->wholeText(), here(), false)); });
-    addCommand(*this, menu, Xlate("&Dictionary\tCtrl+Shift+D"),
-               [this, here] { carryOut(withDictionary(edit_->wholeText(), here())); });
-}
-
-void TemplateWindow::addViewMenu()
-{
-    QMenu &menu = *menuBar()->addMenu(Xlate("&View"));
-    addCommand(*this, menu, Xlate("&Next Remark\tF8"), [this] { stepRemark(1); });
-    addCommand(*this, menu, Xlate("&Previous Remark\tShift+F8"), [this] { stepRemark(-1); });
-    menu.addSeparator();
-    addCommand(*this, menu, Xlate("Text, &Pages, Remarks\tF6"), [this] { turnFocus(); });
-    menu.addSeparator();
-    const auto zoom = [this](int step) {
-        edit_->zoomIn(step);
-        page_->zoomIn(step);
-    };
-    addCommand(*this, menu, Xlate("Zoom &In\tCtrl++"), [zoom] { zoom(1); });
-    addCommand(*this, menu, Xlate("Zoom &Out\tCtrl+-"), [zoom] { zoom(-1); });
-}
-
-/// Gives the keyboard to the next part of the window: a tab is a character of the text.
-void TemplateWindow::turnFocus()
-{
-    QWidget *next = edit_;
-    if (edit_->hasFocus()) {
-        next = page_;
-    } else if (page_->hasFocus()) {
-        next = remarkList_;
-    }
-    next->setFocus(Qt::TabFocusReason);
 }
 
 } // namespace kareport

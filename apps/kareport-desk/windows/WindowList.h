@@ -1,6 +1,7 @@
 #pragma once
 
 #include <QList>
+#include <QString>
 
 #include <functional>
 
@@ -11,7 +12,8 @@ class UDocument;
 namespace kareport
 {
 
-/// The open reports at the end of a menu, with a mark at the one in front. It is filled again whenever the menu opens.
+/// The open reports at the end of a menu, with a mark at the one in front, and the templates that are open in their editors. It
+/// is filled again whenever the menu opens.
 class WindowList
 {
 public:
@@ -23,9 +25,12 @@ public:
     void fill(const UDocument *inFront);
 
 private:
+    QAction *add(const QString &name, bool isModified);
+
     QMenu &menu_;
     std::function<void(UDocument *report)> activate_;
-    QList<QAction *> entries_;
+    QList<QAction *> entries_; ///< with the lines between them
+    qsizetype count_ = 0;      ///< of reports and templates
 };
 
 } // namespace kareport
