@@ -3,18 +3,16 @@
 #include "COneViewPane.h"
 #include "CReportToolBar.h"
 #include "DefaultPrinter.h"
+#include "DeskActions.h"
 #include "DeskCommandIds.h"
 #include "DeskFrame.h"
 #include "DeskPreferences.h"
 #include "HelpWindow.h"
-#include "OpenTemplate.h"
 #include "PaneDock.h"
 #include "ReportEdit.h"
 #include "ReportResources.h"
 #include "SheetColumn.h"
 #include "StartPage.h"
-#include "TemplateTextEdit.h"
-#include "TemplateWindow.h"
 #include "UReportDoc.h"
 #include "UReportView.h"
 #include "UReportWindowDlg.h"
@@ -38,10 +36,6 @@
 namespace monkey
 {
 
-namespace
-{
-
-/// What the keyboard writes into, and commands are for, may change.
 void aimKeyboard(World &world)
 {
     if (const auto *report = dynamic_cast<const UReportDoc *>(world.frame().GetCommandDocument())) {
@@ -51,6 +45,9 @@ void aimKeyboard(World &world)
         world.mayChange.insert(view->GetDocument());
     }
 }
+
+namespace
+{
 
 QWidget *keyboardOf(World &world)
 {
@@ -178,9 +175,9 @@ void openFile(World &world, Chance &chance)
 
 void runJob(World &world, Chance &chance)
 {
-    static const QStringList jobs = {QStringLiteral("long.json"), QStringLiteral("short.json"),
-                                     QStringLiteral("same.json"), QStringLiteral("empty.json"),
-                                     QStringLiteral("wrong.json")};
+    static const QStringList jobs = {QStringLiteral("long.json"),  QStringLiteral("short.json"),
+                                     QStringLiteral("same.json"),  QStringLiteral("empty.json"),
+                                     QStringLiteral("wrong.json"), QStringLiteral("points.json")};
     world.did = jobs.at(chance.below(jobs.size()));
     world.frame().OpenFile(world.files().filePath(world.did));
 }
@@ -455,41 +452,6 @@ void failEditor(World &world, Chance & /*chance*/)
     kareport::savePreferences(preferences);
 }
 
-/// Works in the editor of a template, which may stay open.
-void editTemplate(World &world, Chance &chance)
-{
-    static const QStringList pieces = {QStringLiteral("<"),     QStringLiteral("</Field>"), QStringLiteral("x"),
-                                       QStringLiteral("RIGHT"), QStringLiteral("<Field>"),  QStringLiteral("\t")};
-    const QString path = world.folder().filePath(QStringLiteral("edited.xml"));
-    if (QFile file(path); !file.exists() && file.open(QIODevice::WriteOnly)) {
-        file.write("<ReportTemplate>\n\t<Name>T</Name>\n\t<Title>Title</Title>\n</ReportTemplate>\n");
-    }
-    kareport::openTemplateAt(path);
-    for (QWidget *widget : QApplication::topLevelWidgets()) {
-        auto *window = dynamic_cast<kareport::TemplateWindow *>(widget);
-        if (window == nullptr || !window->isVisible()) {
-            continue;
-        }
-        for (int step = 0; step < 4; ++step) {
-            const int place = chance.below(window->edit().document()->characterCount());
-            window->edit().select({place, place});
-            QTest::keyClicks(&window->edit(), pieces.at(chance.below(pieces.size())));
-            QList<QAction *> actions;
-            for (QAction *menu : window->menuBar()->actions().mid(1)) { // files are asked for in the first one
-                collect(*menu->menu(), actions);
-            }
-            QAction *action = chance.of(actions);
-            world.did += action->text() + u' ';
-            action->trigger();
-            QCoreApplication::processEvents();
-        }
-        if (chance.oneIn(2)) {
-            window->close();
-        }
-        return;
-    }
-}
-
 } // namespace
 
 const std::vector<Action> &allActions()
@@ -523,7 +485,11 @@ const std::vector<Action> &allActions()
         {"start-page", 3, false, useStartPage},
         {"exit", 2, false, exitDesk},
         {"crash", 1, false, crash},
-        {"template", 1, false, editTemplate},
+        {"template", 2, false, editTemplate},
+        {"import", 3, false, importData},
+        {"units", 3, false, chooseUnits},
+        {"note", 3, false, goToNote},
+        {"change-data", 1, false, changeData},
         {"fail-files", 2, true, failFiles},
         {"fail-printer", 1, true, failPrinter},
         {"fail-editor", 1, true, failEditor},

@@ -1,6 +1,7 @@
 #include "World.h"
 
 #include "COneViewPane.h"
+#include "CommandList.h"
 #include "DeskFrame.h"
 #include "PaneDock.h"
 #include "ReportContent.h"
@@ -10,11 +11,13 @@
 #include "UReportView.h"
 #include "UReportWindowDlg.h"
 
+#include <QAction>
 #include <QApplication>
 #include <QBuffer>
 #include <QDockWidget>
 #include <QFile>
 #include <QFileInfo>
+#include <QMenuBar>
 #include <QMessageBox>
 #include <QTabBar>
 #include <QTextDocument>
@@ -93,9 +96,10 @@ QString World::check()
     if (QApplication::activeModalWidget() != nullptr) {
         return QStringLiteral("a window stays open after the step");
     }
-    const std::function<QString()> parts[] = {[this] { return checkClosed(); }, [this] { return checkTexts(); },
-                                              [this] { return checkFiles(); },  [this] { return checkWindows(); },
-                                              [this] { return checkActive(); }, [this] { return checkPages(); }};
+    const std::function<QString()> parts[] = {[this] { return checkClosed(); },  [this] { return checkTexts(); },
+                                              [this] { return checkFiles(); },   [this] { return checkWindows(); },
+                                              [this] { return checkActive(); },  [this] { return checkPages(); },
+                                              [this] { return checkCommands(); }};
     for (const auto &part : parts) {
         if (const QString wrong = part(); !wrong.isEmpty()) {
             return wrong + describePanes();
@@ -117,6 +121,9 @@ QString World::checkClosed() const
     });
     for (const Seen &gone : closed_) {
         const Seen *was = seen(gone.id);
+        if (was == nullptr && mayChange.count(gone.report) == 0) {
+            continue; // the report of a job that went wrong has come and gone
+        }
         const bool hadChanges = gone.isModified || (was != nullptr && was->isModified);
         if (!hadChanges || gone.text.isEmpty() || isKept(gone.text)) {
             continue;
@@ -141,7 +148,9 @@ QString World::checkTexts() const
 {
     for (const UReportDoc *report : reports()) {
         const Seen *was = seen(ids_.value(report));
-        if (was == nullptr || isReloaded(*was)) {
+        // One that follows its files may be made again at any time.
+        const bool follows = frame_->runs().followsFiles() && frame_->runs().recipeOf(report) != nullptr;
+        if (was == nullptr || follows || isReloaded(*was)) {
             continue;
         }
         const QString text = textOf(*report);
@@ -167,6 +176,23 @@ QString World::checkTexts() const
         if (view->GetEdit().isLoading() ? !text.startsWith(shown) : text != shown) {
             return QStringLiteral("a view of %1 shows another text than the report has: %2")
                 .arg(nameOf(*report), difference(text, shown));
+        }
+    }
+    return {};
+}
+
+/// Every command can act or says why not.
+QString World::checkCommands() const
+{
+    if (!frame_->isVisible()) {
+        return {};
+    }
+    frame_->UpdateCommands();
+    for (const kareport::ListedCommand &command : kareport::listedCommands(*frame_->menuBar())) {
+        if (command.action->isEnabled() != command.action->statusTip().isEmpty()) {
+            return QStringLiteral("the command %1 is %2 and says \"%3\"")
+                .arg(command.name, command.action->isEnabled() ? QStringLiteral("enabled") : QStringLiteral("disabled"),
+                     command.action->statusTip());
         }
     }
     return {};

@@ -35,6 +35,10 @@ public:
     void begin(Chance chance) { chance_ = chance; }
     /// What was asked since the last call.
     std::vector<Answer> take();
+    /// How many were asked since then.
+    std::size_t count() const { return answers_.size(); }
+    /// The last question that was asked since then; empty without one.
+    QString last() const { return answers_.empty() ? QString() : answers_.back().question; }
     /// Answers what an open dialog asks for a file to read, or a name to save under.
     std::function<QString(Chance &, bool saves)> file;
     /// The file that the next dialog for one is answered with, whatever chance says; empty for none.

@@ -2,6 +2,7 @@
 
 #include "Actions.h"
 #include "COneViewPane.h"
+#include "DeskActions.h"
 #include "DeskApplication.h"
 #include "DeskFrame.h"
 #include "JobLauncher.h"
@@ -82,6 +83,7 @@ World::World(const QString &folder) : folder_(folder)
     folder_.mkpath(QStringLiteral("editors"));
     folder_.mkpath(QStringLiteral("bin"));
     makeFiles();
+    makePoints(*this);
     answers_.file = [this](Chance &chance, bool saves) {
         return saves ? newPath(chance) : files().filePath([&] {
             const QStringList names = files().entryList(QDir::Files);
@@ -117,6 +119,10 @@ void World::makeFiles() const
             R"({"title": "Short", "report": [{"line": "Another of this name"}, {"lineFeed": 100}, {"line": "far"}]})");
     putFile(dir.filePath(QStringLiteral("empty.json")), R"({"title": "Nothing", "header": false, "report": []})");
     putFile(dir.filePath(QStringLiteral("wrong.json")), R"({"title": "Wrong", "report": [{"lines": 1}]})");
+    putFile(dir.filePath(QStringLiteral("points.json")),
+            R"({"title": "Points", )" + page + R"(, "template": {"file": "../data/points.xml", "name": "P"},
+                "data": {"p": {"csv": "../data/points.csv"}}, "report": [{"table": "All", "data": "p"}]})");
+    putFile(dir.filePath(QStringLiteral("dropped.csv")), "Number,Northing,Easting\n1,2.5,3\n");
     putFile(dir.filePath(QStringLiteral("saved.rep")),
             "\xEF\xBB\xBFTALVEN Survey - Saved          Mar 05, 2024  02:07PM    Page:  1\r\r\n\r\r\nA line\r\r\n");
     putFile(dir.filePath(QStringLiteral("plain.txt")), "a text\nof two lines, and \xC3\xA9 \xE6\xB8\xAC\n");
@@ -252,6 +258,11 @@ void World::run(const Step &step)
     if (++steps_ % 50 == 0) {
         wait(20);
     }
+}
+
+void World::fail(const QString &what)
+{
+    wrong_ = wrong_.isEmpty() ? what : wrong_;
 }
 
 void World::wait(int milliseconds)

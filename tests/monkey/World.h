@@ -89,6 +89,8 @@ public:
     void reopen(Chance &chance);
     /// Opens a report so long that it is loaded in pieces.
     void openLong();
+    /// The step has found something wrong.
+    void fail(const QString &what);
 
     // What the step that runs says of itself.
     std::set<const UReportDoc *> mayChange; ///< texts that it edits
@@ -141,6 +143,7 @@ private:
     QString checkWindows();
     QString checkActive() const;
     QString checkPages();
+    QString checkCommands() const;
     /// Where the panes are, for the log.
     QString describePanes() const;
 
