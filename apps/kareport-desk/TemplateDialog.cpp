@@ -119,6 +119,10 @@ QLayout *TemplateDialog::makeForm()
 void TemplateDialog::followFields()
 {
     import_->setChangedHandler([this] { check(); });
+    askServer = [this](const QString &connection) -> std::optional<ServerTables> {
+        ServerDialog dialog(connection, this);
+        return dialog.exec() == QDialog::Accepted ? std::optional(dialog.tables()) : std::nullopt;
+    };
     connect(file_, &QLineEdit::textChanged, this, &TemplateDialog::readTemplates);
     connect(template_, &QComboBox::currentIndexChanged, this, &TemplateDialog::readOutputs);
     connect(output_, &QComboBox::currentIndexChanged, this, &TemplateDialog::useOutput);

@@ -57,6 +57,17 @@ public:
     UReportDoc *report = nullptr;
 };
 
+TEST(NotesPane, IsNotPutAmongTheReports)
+{
+    NotedDesk desk;
+    desk.pane().open();
+    EXPECT_FALSE(desk.pane().isAreaAllowed(Qt::TopDockWidgetArea))
+        << "where it would hide the report with the keyboard";
+    for (const auto area : {Qt::LeftDockWidgetArea, Qt::RightDockWidgetArea, Qt::BottomDockWidgetArea}) {
+        EXPECT_TRUE(desk.pane().isAreaAllowed(area));
+    }
+}
+
 TEST(NotesPane, ListsWhatThereIsToSay)
 {
     NotedDesk desk;

@@ -75,6 +75,8 @@ NotesPane &DeskRuns::notesPane()
             }
         });
         notes_->setGoHandler([this](int number, bool isInFile) { goToNote(number, isInFile); });
+        // At the top are the reports: as a tab among them it would hide the one that has the keyboard.
+        notes_->setAllowedAreas(Qt::LeftDockWidgetArea | Qt::RightDockWidgetArea | Qt::BottomDockWidgetArea);
         frame_.addDockWidget(Qt::BottomDockWidgetArea, notes_);
         notes_->hide();
         showNotes();
