@@ -1,5 +1,7 @@
 #!/usr/bin/env python3
-"""What scripts/tidy.py reads together, again and not again, in a small tree with a clang-tidy that finds the word BAD."""
+"""What scripts/tidy.py reads together, again and not again, in a small tree with a clang-tidy that finds the word BAD; and what
+the real one finds in sources that are read together, where it is installed.
+"""
 import json
 import os
 import pathlib
@@ -58,6 +60,7 @@ class Tidy(unittest.TestCase):
             (self.root / name).chmod(0o755)
         for name in ("INSTALLED", "VERSION", ".clang-tidy"):
             self.write(name, "1")
+        self.path = f"{self.root}/bin:{os.environ['PATH']}"
         self.options = {}
         self.compiled = [name for name in PAGE if name.endswith(".cpp")]
         for name, text in PAGE.items():
@@ -77,7 +80,7 @@ class Tidy(unittest.TestCase):
         (self.root / "READ").unlink(missing_ok=True)
         (self.root / "READ").touch()
         run = subprocess.run([self.root / "scripts/tidy.py", *(folders or ["page"])], cwd=self.root, text=True,
-                             env={**os.environ, "PATH": f"{self.root}/bin:{os.environ['PATH']}"}, capture_output=True, check=False)
+                             env={**os.environ, "PATH": self.path}, capture_output=True, check=False)
         self.assertEqual(run.stderr, "")
         said = [line.removeprefix(f"{self.root}/") for line in run.stdout.splitlines() if " error: " in line]
         return run.returncode, said, (self.root / "READ").read_text().splitlines()
@@ -158,6 +161,41 @@ class Tidy(unittest.TestCase):
         self.assertEqual((status, said), (1, ["tests/page/ATest.cpp:4:1: error: BAD"]))
         batches = [f"build/tidy/tests/page/batch{number}.cpp" for number in range(2)]
         self.assertEqual(files, [" ".join(batches), *batches])
+
+    @unittest.skipUnless(shutil.which("clang-tidy"), "clang-tidy is not installed")
+    def test_clang_tidy_finds_the_same_in_files_that_are_read_together(self):
+        self.path = os.environ["PATH"]
+        for name in (".clang-tidy", "scripts/tidy-scope.cpp"):
+            self.write(name, (SCRIPT.parent.parent / name).read_text())
+        self.write("page/A.h", "#pragma once\n#include <string>\ninline int *none() { return 0; }\n")
+        self.write("page/A.cpp", """#include "A.h"
+namespace
+{
+int valueOf(const int *place)
+{
+    if (place == nullptr) {
+        return *place;
+    }
+    return 1;
+}
+}
+int a(const int *place) { return valueOf(place); }
+""")
+        self.write("page/B.cpp", """#include "A.h"
+#include <utility>
+std::size_t b(std::string text)
+{
+    const std::string other = std::move(text);
+    return text.size() + other.size();
+}
+""")
+        status, said, _ = self.run_over()
+        found = {line.split(" ")[0] + line[line.rindex("["):].replace(",-warnings-as-errors", "") for line in said}
+        self.assertEqual(status, 1)
+        self.assertEqual(found, {"page/A.h:3:29:[modernize-use-nullptr]",
+                                 "page/A.cpp:7:16:[clang-analyzer-core.NullDereference]",
+                                 "page/B.cpp:6:12:[bugprone-use-after-move]",
+                                 "page/B.cpp:6:12:[clang-analyzer-cplusplus.Move]"})
 
 
 if __name__ == "__main__":
