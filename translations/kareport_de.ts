@@ -1344,23 +1344,33 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlComparison.cpp"/>
-        <source>the element begins %1 from the end of the element before</source>
-        <translation>das Element beginnt %1 vom Ende des vorigen Elements entfernt</translation>
+        <source>the element begins %1 from the end of the element before: at %2, but that ends at %3</source>
+        <translation>das Element beginnt %1 vom Ende des vorigen Elements entfernt: bei %2, doch jenes endet bei %3</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlComparison.cpp"/>
-        <source>the element begins at an angle of %1 to the end of the element before: perhaps one of them bends to the other side</source>
-        <translation>das Element beginnt in einem Winkel von %1 zum Ende des Elements davor: vielleicht biegt eines der beiden zur anderen Seite</translation>
+        <source>the curve has no Center, length, delta or PI that says which way round it goes: the shorter arc of its radius was taken</source>
+        <translation>der Bogen hat weder Center noch length, delta oder PI, die sagen, wie herum er geht: der kürzere Bogen seines Radius wurde genommen</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlComparison.cpp"/>
-        <source>the element begins at an angle of %1 to the end of the element before</source>
-        <translation>das Element beginnt in einem Winkel von %1 zum Ende des Elements davor</translation>
+        <source>the element begins at an angle of %1 to the end of the element before, with bearing %2 after %3: perhaps one of them bends to the other side</source>
+        <translation>das Element beginnt in einem Winkel von %1 zum Ende des Elements davor, mit der Richtung %2 nach %3: vielleicht biegt eines der beiden zur anderen Seite</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlComparison.cpp"/>
-        <source>%1 is %2 beside the tangents of the element: perhaps the element bends to the other side</source>
-        <translation>%1 liegt %2 neben den Tangenten des Elements: vielleicht biegt das Element zur anderen Seite</translation>
+        <source>the element begins at an angle of %1 to the end of the element before, with bearing %2 after %3</source>
+        <translation>das Element beginnt in einem Winkel von %1 zum Ende des Elements davor, mit der Richtung %2 nach %3</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlComparison.cpp"/>
+        <source>PI is %1 in the file, but %2 by its geometry: %3 beside the tangents of the element, which perhaps bends to the other side</source>
+        <translation>PI ist %1 in der Datei, doch %2 nach der Geometrie: %3 neben den Tangenten des Elements, das vielleicht zur anderen Seite biegt</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlComparison.cpp"/>
+        <source>PI is %1 in the file, but the tangents of the element are parallel</source>
+        <translation>PI ist %1 in der Datei, doch die Tangenten des Elements sind parallel</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>

@@ -1344,23 +1344,33 @@
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlComparison.cpp"/>
-        <source>the element begins %1 from the end of the element before</source>
-        <translation>要素の始点が前の要素の終点から %1 離れています</translation>
+        <source>the element begins %1 from the end of the element before: at %2, but that ends at %3</source>
+        <translation>要素の始点が前の要素の終点から %1 離れています: 始点は %2、前の要素の終点は %3 です</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlComparison.cpp"/>
-        <source>the element begins at an angle of %1 to the end of the element before: perhaps one of them bends to the other side</source>
-        <translation>要素の始点の方向が、前の要素の終点の方向と%1だけ異なります: どちらかの要素が反対側に曲がっている可能性があります</translation>
+        <source>the curve has no Center, length, delta or PI that says which way round it goes: the shorter arc of its radius was taken</source>
+        <translation>曲線に、回る向きを示す Center、length、delta、PI のいずれもありません: 半径の短い方の円弧としました</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlComparison.cpp"/>
-        <source>the element begins at an angle of %1 to the end of the element before</source>
-        <translation>要素の始点の方向が、前の要素の終点の方向と%1だけ異なります</translation>
+        <source>the element begins at an angle of %1 to the end of the element before, with bearing %2 after %3: perhaps one of them bends to the other side</source>
+        <translation>要素の始点の方向が、前の要素の終点の方向と%1だけ異なります (方向角は %3 から %2): どちらかの要素が反対側に曲がっている可能性があります</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlComparison.cpp"/>
-        <source>%1 is %2 beside the tangents of the element: perhaps the element bends to the other side</source>
-        <translation>%1 は要素の接線から %2 離れています: 要素は反対側に曲がっている可能性があります</translation>
+        <source>the element begins at an angle of %1 to the end of the element before, with bearing %2 after %3</source>
+        <translation>要素の始点の方向が、前の要素の終点の方向と%1だけ異なります (方向角は %3 から %2)</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlComparison.cpp"/>
+        <source>PI is %1 in the file, but %2 by its geometry: %3 beside the tangents of the element, which perhaps bends to the other side</source>
+        <translation>PI はファイルでは %1 ですが、幾何形状からは %2 です: 要素の接線から %3 離れており、要素は反対側に曲がっている可能性があります</translation>
+    </message>
+    <message>
+        <location filename="../sources/landxml/LandXmlComparison.cpp"/>
+        <source>PI is %1 in the file, but the tangents of the element are parallel</source>
+        <translation>PI はファイルでは %1 ですが、要素の接線は平行です</translation>
     </message>
     <message>
         <location filename="../sources/landxml/LandXmlCurveParts.cpp"/>

@@ -26,7 +26,8 @@ struct ElementRows::Variables
     }
     static double arcRadius(const Rows &rows)
     {
-        return rows.start_ ? radiusOf(rows.start_->curvature) : rows.element_->radius;
+        const double stated = rows.element_->radius;
+        return std::isnan(stated) && rows.start_ ? radiusOf(rows.start_->curvature) : stated;
     }
     static LandXmlValue typeOf(const LandXmlElement &element)
     {
@@ -150,9 +151,9 @@ std::optional<PlanePoint> ElementRows::intersectionOf(const LandXmlRoute::Piece 
 void ElementRows::noteIntersection(const LandXmlRoute &route, const LandXmlRoute::Piece &piece)
 {
     const bool isCurved = piece.curves.size() == 1 && !piece.curves.front().isLine();
-    if (isCurved && !intersectionOf(piece)) {
-        modelNotes_.add(route.stored->elements[piece.element].byte,
-                        Xlate("the tangents of the element are parallel: it has no PI"));
+    const LandXmlElement &element = route.stored->elements[piece.element];
+    if (isCurved && !element.intersection.position && !intersectionOf(piece)) {
+        modelNotes_.add(element.byte, Xlate("the tangents of the element are parallel: it has no PI"));
     }
 }
 
@@ -172,10 +173,9 @@ void ElementRows::take(std::size_t index)
     }
     start_ = piece_->curves.front().start();
     end_ = piece_->curves.back().end();
-    startPoint_ = start_->point;
-    endPoint_ = end_->point;
-    centre_ = centreOf(piece_->curves.front());
-    intersection_ = intersectionOf(*piece_);
+    // What the file states is listed as it is: where it differs from the geometry, a note has said so.
+    centre_ = centre_ ? centre_ : centreOf(piece_->curves.front());
+    intersection_ = intersection_ ? intersection_ : intersectionOf(*piece_);
 }
 
 } // namespace kareport

@@ -5,7 +5,7 @@
 namespace kareport
 {
 
-/// The horizontal elements of alignments, as they are stored, with what their geometry gives.
+/// The horizontal elements of alignments as they are stored, and what their geometry gives where nothing is stored.
 class ElementRows : public ModelRows
 {
 public:
@@ -32,9 +32,9 @@ private:
     const LandXmlElement *element_ = nullptr;
     std::optional<CurvePlace> start_; ///< nothing where the element has no geometry
     std::optional<CurvePlace> end_;
-    std::optional<PlanePoint> startPoint_; ///< as stored where it has none, like those that follow
+    std::optional<PlanePoint> startPoint_; ///< as stored
     std::optional<PlanePoint> endPoint_;
-    std::optional<PlanePoint> intersection_;
+    std::optional<PlanePoint> intersection_; ///< as stored; by the geometry where the file states none
     std::optional<PlanePoint> centre_;
 };
 

@@ -11,7 +11,8 @@ namespace kareport
 namespace
 {
 
-/// Whether an arc is longer than half a circle, as far as the file says.
+/// Whether an arc is longer than half a circle, as far as the file says. One of which it says nothing is taken for the shorter
+/// one, which is noted with what is compared.
 bool isLongArc(const LandXmlElement &element)
 {
     const double half = std::numbers::pi;

@@ -1,5 +1,6 @@
 #include "LandXmlComparison.h"
 
+#include "CurveFit.h"
 #include "Xlate.h"
 
 #include <algorithm>
@@ -41,6 +42,16 @@ void LandXmlComparison::note(std::size_t byte, const char *what, const QString &
 QString LandXmlComparison::lengthText(double metres) const
 {
     return QString::number(metres / units_.metres, 'f', 4);
+}
+
+QString LandXmlComparison::pointText(PlanePoint point) const
+{
+    return lengthText(point.northing) + u' ' + lengthText(point.easting);
+}
+
+QString LandXmlComparison::bearingText(double bearing) const
+{
+    return landXmlAngleText(normalizedBearing(bearing), units_.direction);
 }
 
 void LandXmlComparison::length(std::size_t byte, const char *what, double stated, double computed)
@@ -92,9 +103,7 @@ void LandXmlComparison::noteDirections()
     }
     for (const Direction &direction : directions_) {
         if (!fits(direction, best)) {
-            note(direction.byte, direction.what,
-                 landXmlAngleText(normalizedBearing(direction.stated), units_.direction),
-                 landXmlAngleText(normalizedBearing(best(direction.bearing)), units_.direction));
+            note(direction.byte, direction.what, bearingText(direction.stated), bearingText(best(direction.bearing)));
         }
     }
     directions_.clear();
@@ -103,18 +112,24 @@ void LandXmlComparison::noteDirections()
 void LandXmlComparison::end(std::size_t byte, PlanePoint stated, PlanePoint computed)
 {
     if (!(distanceBetween(stated, computed) <= tolerance_.length)) {
-        const auto text = [this](PlanePoint point) {
-            return lengthText(point.northing) + u' ' + lengthText(point.easting);
-        };
-        note(byte, "End", text(stated), text(computed));
+        note(byte, "End", pointText(stated), pointText(computed));
     }
 }
 
-void LandXmlComparison::gap(std::size_t byte, double width)
+void LandXmlComparison::gap(std::size_t byte, PlanePoint before, PlanePoint start)
 {
+    const double width = distanceBetween(before, start);
     if (!(width <= tolerance_.length)) {
-        notes_.add(byte, Xlate("the element begins %1 from the end of the element before").arg(lengthText(width)));
+        notes_.add(byte, Xlate("the element begins %1 from the end of the element before: at %2, but that ends at %3")
+                             .arg(lengthText(width), pointText(start), pointText(before)));
     }
+}
+
+void LandXmlComparison::shortWay(std::size_t byte)
+{
+    notes_.add(byte,
+               Xlate("the curve has no Center, length, delta or PI that says which way round it goes: the shorter "
+                     "arc of its radius was taken"));
 }
 
 void LandXmlComparison::corner(std::size_t byte, const PlaneCurve &before, const PlaneCurve &curve)
@@ -129,14 +144,15 @@ void LandXmlComparison::corner(std::size_t byte, const PlaneCurve &before, const
     if (fits(end, start)) {
         return;
     }
-    const QString angle = landXmlAngleText(turnBetween(end, start), units_.angle);
+    const auto add = [&](const QString &text) {
+        notes_.add(byte, text.arg(landXmlAngleText(turnBetween(end, start), units_.angle), bearingText(start),
+                                  bearingText(end)));
+    };
     if (fits(end, mirrored(curve, start)) || fits(mirrored(before, end), start)) {
-        notes_.add(byte,
-                   Xlate("the element begins at an angle of %1 to the end of the element before: perhaps one of them "
-                         "bends to the other side")
-                       .arg(angle));
+        add(Xlate("the element begins at an angle of %1 to the end of the element before, with bearing %2 after %3: "
+                  "perhaps one of them bends to the other side"));
     } else if (isTransition(before) || isTransition(curve)) {
-        notes_.add(byte, Xlate("the element begins at an angle of %1 to the end of the element before").arg(angle));
+        add(Xlate("the element begins at an angle of %1 to the end of the element before, with bearing %2 after %3"));
     }
 }
 
@@ -145,11 +161,16 @@ void LandXmlComparison::intersection(std::size_t byte, PlanePoint stated, const 
     const double start = seenFrom(curve.start(), stated).easting;
     const double end = seenFrom(curve.end(), stated).easting;
     const double off = std::max(std::fabs(start), std::fabs(end));
-    if (!(off <= tolerance_.length)) {
-        notes_.add(byte,
-                   Xlate("%1 is %2 beside the tangents of the element: perhaps the element bends to the other side")
-                       .arg(QStringLiteral("PI"), lengthText(off)));
+    if (off <= tolerance_.length) {
+        return;
     }
+    const auto computed = tangentIntersection(curve);
+    const QString text =
+        computed ? Xlate("PI is %1 in the file, but %2 by its geometry: %3 beside the tangents of the element, which "
+                         "perhaps bends to the other side")
+                       .arg(pointText(stated), pointText(*computed), lengthText(off))
+                 : Xlate("PI is %1 in the file, but the tangents of the element are parallel").arg(pointText(stated));
+    notes_.add(byte, text);
 }
 
 } // namespace kareport

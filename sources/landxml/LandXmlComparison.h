@@ -40,11 +40,13 @@ public:
     void direction(std::size_t byte, const char *what, double stated, double bearing, const PlaneCurve &curve);
     /// Compares the end of an element.
     void end(std::size_t byte, PlanePoint stated, PlanePoint computed);
-    /// Notes an element that does not begin where the one before ends. @param width  how far it is
-    void gap(std::size_t byte, double width);
+    /// Notes an element that does not begin where the one before ends.
+    void gap(std::size_t byte, PlanePoint before, PlanePoint start);
     /// Notes an element that does not continue in the direction of the one before, where it would if one of both bent to the
     /// other side, or where one of both is a transition. Other lines and arcs may meet at any angle.
     void corner(std::size_t byte, const PlaneCurve &before, const PlaneCurve &curve);
+    /// Notes a curve that the file leaves open to be the shorter or the longer arc of its circle.
+    void shortWay(std::size_t byte);
     /// The point where the tangents meet has to lie on both.
     void intersection(std::size_t byte, PlanePoint stated, const PlaneCurve &curve);
 
@@ -65,6 +67,8 @@ private:
 
     void note(std::size_t byte, const char *what, const QString &stated, const QString &computed);
     QString lengthText(double metres) const;
+    QString pointText(PlanePoint point) const;
+    QString bearingText(double bearing) const;
     double allowedTurn(const PlaneCurve &curve) const;
 
     LandXmlUnits units_;

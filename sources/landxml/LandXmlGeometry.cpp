@@ -90,6 +90,14 @@ LandXmlCurves spiralOf(const LandXmlElement &element, const LandXmlEnds &ends)
                                           side / element.radiusEnd));
 }
 
+/// Whether the file says which of the two arcs of a radius and a side a curve is. Half a circle is both.
+bool isWayStated(const LandXmlElement &element, const LandXmlEnds &ends, double tolerance)
+{
+    return element.centre.isGiven() || isGiven(element.length) || isGiven(element.delta) ||
+           element.intersection.position ||
+           std::fabs(distanceBetween(ends.start, ends.end) - 2 * element.radius) <= tolerance;
+}
+
 void compareWithStated(const LandXmlElement &element, const LandXmlEnds &ends, const PlaneCurve &curve,
                        LandXmlComparison &comparison)
 {
@@ -99,6 +107,9 @@ void compareWithStated(const LandXmlElement &element, const LandXmlEnds &ends, c
     }
     if (element.kind == LandXmlElement::Kind::Curve) {
         comparison.length(element.byte, "radius", element.radius, std::fabs(1 / curve.startCurvature()));
+        if (!isWayStated(element, ends, comparison.tolerance().length)) {
+            comparison.shortWay(element.byte);
+        }
     }
     comparison.direction(element.byte, element.kind == LandXmlElement::Kind::Line ? "dir" : "dirStart",
                          element.direction, curve.start().bearing, curve);

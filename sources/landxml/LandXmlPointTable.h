@@ -19,6 +19,9 @@ public:
     /// Adds a point under its name and its identifier. Of several points with one name the first is found. A name counts
     /// before an identifier: many programs number both, from different points. A point that refers to another one of its own
     /// name is the same point in another group.
+    ///
+    /// A point takes up to 400 bytes, and where its texts are long, up to twice their bytes. The reader counts 30 bytes of the
+    /// file for each, so that the table takes at most 16 times the memory of the file, and 14 MB.
     void add(const LandXmlPoint &point);
 
     /// A point that was found. The texts are empty where it has none, and valid as long as the table.

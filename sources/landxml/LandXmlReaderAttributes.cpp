@@ -46,6 +46,9 @@ void LandXmlReader::beginPoint(Tag tag, const XmlAttributes &attributes)
     if (point.name.empty() || tag == Tag::SurfacePoint) {
         std::swap(point.name, point.id);
     }
+    if (wants_.isForReferences && !(point.name.empty() && point.id.empty())) {
+        weigh(leastNamedPoint);
+    }
     isInPoint_ = true;
     point.owner = openOwners_.back();
     point.at.position.reset();

@@ -138,7 +138,7 @@ private:
             const std::size_t byte = stored_.elements[piece.element].byte;
             const PlaneCurve &before = route_.alignment.elements().back().curve;
             const PlaneCurve &curve = piece.curves.front();
-            comparison_.gap(byte, distanceBetween(before.end().point, curve.start().point));
+            comparison_.gap(byte, before.end().point, curve.start().point);
             comparison_.corner(byte, before, curve);
         }
         for (const PlaneCurve &curve : piece.curves) {

@@ -8,7 +8,8 @@ namespace kareport
 /// Bytes that elements take in a file at the least, and points in a list of numbers.
 inline constexpr std::size_t leastElement = 40;
 inline constexpr std::size_t leastPoint = 12;
-inline constexpr std::size_t leastPair = 8; ///< a point of a profile or a section
+inline constexpr std::size_t leastNamedPoint = 30; ///< an element with a name and two numbers
+inline constexpr std::size_t leastPair = 8;        ///< a point of a profile or a section
 inline constexpr std::size_t leastGradePoint = 20;
 inline constexpr std::size_t leastSectionPoint = 30;
 

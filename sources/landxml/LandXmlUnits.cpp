@@ -5,7 +5,6 @@
 
 #include <algorithm>
 #include <cmath>
-#include <iterator>
 #include <string>
 
 namespace kareport
@@ -140,12 +139,13 @@ private:
     void takeElevationUnit(const XmlAttributes &attributes)
     {
         header_.unitsByte = stream_.currentByte();
-        const std::string name = folded(attributes.text("elevationUnit"));
+        if (!attributes.find("elevationUnit")) {
+            return;
+        }
+        double metres = header_.units.metres;
+        takeSize(attributes, "elevationUnit", lengths, metres);
         constexpr double asFeet = 1e-5;
-        const auto isTheSame = [&](const Unit &unit) {
-            return unit.name == name && std::fabs(unit.size / header_.units.metres - 1) < asFeet;
-        };
-        if (!name.empty() && std::none_of(std::begin(lengths), std::end(lengths), isTheSame)) {
+        if (std::fabs(metres / header_.units.metres - 1) >= asFeet) {
             header_.otherElevationUnit = textOf(attributes.text("elevationUnit"));
         }
     }

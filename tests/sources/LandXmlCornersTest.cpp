@@ -33,19 +33,20 @@ TEST(LandXmlCorners, OfALineAndAnArcAreSoundUnlessTheArcIsMirrored)
     const QByteArray east = QByteArray(kerb).replace("%", "cw");
     EXPECT_EQ(notesOf(fileOf(alignment(line("0 0", "100 0") + east))), QStringList());
     // One to the right would begin to the north, as the line leads.
-    const QByteArray wrong = "<Curve rot='ccw' radius='10'><Start>100 0</Start><End>110 10</End></Curve>";
+    const QByteArray wrong =
+        "<Curve rot='ccw' radius='10' length='15.708'><Start>100 0</Start><End>110 10</End></Curve>";
     const QStringList notes = notesOf(fileOf(alignment(line("0 0", "100 0") + wrong)));
     ASSERT_EQ(notes.size(), 1);
-    EXPECT_TRUE(notes[0].startsWith(u"6:1: the element begins at an angle of ") &&
-                notes[0].endsWith(u"perhaps one of them bends to the other side"))
-        << notes[0].toStdString();
+    EXPECT_EQ(notes[0],
+              u"6:1: the element begins at an angle of 90.00000 to the end of the element before, with bearing "
+              "90.00000 after 0.00000: perhaps one of them bends to the other side"_qs);
     // A transition begins where the one before leads, or one of both is wrong.
     const PlaneCurve in = curve(TransitionForm::Clothoid, {100, 0}, 0.3, 60, 0, 1 / 200.0);
     const QStringList bent = notesOf(fileOf(alignment(line("0 0", "100 0") + spiral(in, "clothoid"))));
     ASSERT_EQ(bent.size(), 1);
-    EXPECT_TRUE(bent[0].startsWith(u"6:1: the element begins at an angle of 17.18") &&
-                bent[0].endsWith(u"to the end of the element before"))
-        << bent[0].toStdString();
+    EXPECT_EQ(bent[0],
+              u"6:1: the element begins at an angle of 17.18873 to the end of the element before, with bearing "
+              "17.18873 after 0.00000"_qs);
 }
 
 TEST(LandXmlCorners, TheDirectionsOfASmallRadiusDependOnTheDigitsOfItsCentre)

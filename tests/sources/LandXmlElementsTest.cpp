@@ -89,17 +89,23 @@ TEST(LandXmlElements, CurvesWithoutACentreHaveTheirRadius)
     {
         const char *attributes;
         double centre;
+        bool isNoted; // that the file does not say which way
         const char *reason;
     };
-    const Row rows[] = {{"rot='cw' radius='5'", 4, "the short way"},
-                        {"rot='ccw' radius='5'", -4, "to the left"},
-                        {"rot='cw' radius='5' length='24.9809'", -4, "the long way, by its length"},
-                        {"rot='cw' radius='5' delta='286.26'", -4, "by its angle"}};
+    const Row rows[] = {{"rot='cw' radius='5'>", 4, true, "the short way"},
+                        {"rot='ccw' radius='5'>", -4, true, "to the left"},
+                        {"rot='ccw' radius='3'>", 0, false, "half a circle has no other way"},
+                        {"rot='cw' radius='5'><PI>3 -2.25</PI>", 4, false, "by its tangents"},
+                        {"rot='cw' radius='5' length='24.9809'>", -4, false, "the long way, by its length"},
+                        {"rot='cw' radius='5' length='6.435'>", 4, false, "the short way, by its length"},
+                        {"rot='cw' radius='5' delta='286.26'>", -4, false, "by its angle"}};
+    const QString note = u"5:1: the curve has no Center, length, delta or PI that says which way round it goes: "
+                         "the shorter arc of its radius was taken"_qs;
     for (const Row &row : rows) {
-        LandXmlFile file(fileOf(alignment(QByteArray("<Curve ") + row.attributes + ">" + ends)),
-                         queryOf(Kind::Elements));
+        LandXmlFile file(fileOf(alignment(QByteArray("<Curve ") + row.attributes + ends)), queryOf(Kind::Elements),
+                         {QStringLiteral("CentreEasting")});
         EXPECT_NEAR(file.number(0, "CentreEasting"), row.centre, 1e-9) << row.reason;
-        EXPECT_EQ(file.notes(), QStringList()) << row.reason;
+        EXPECT_EQ(file.notes(), row.isNoted ? QStringList(note) : QStringList()) << row.reason;
     }
 }
 
@@ -172,12 +178,18 @@ TEST(LandXmlElements, WhatDiffersFromTheGeometryIsNotedWithBothValues)
          "5:1: End is 1200.0100 600.0000 in the file, but 1200.0000 600.0000 by its geometry", "an end"},
         {moved, "5:1: End is 162.9024 202.6013 in the file, but 162.4033 202.5806 by its geometry",
          "the end of a transition, which was laid towards it"},
-        {mirrored, "5:1: PI is 3.4695 beside the tangents of the element: perhaps the element bends to the other side",
+        {mirrored,
+         "5:1: PI is 141.6873 200.0000 in the file, but 141.5561 203.4706 by its geometry: 3.4695 beside the tangents of "
+         "the element, which perhaps bends to the other side",
          "a transition to the wrong side"},
+        {"<Line><Start>0 0</Start><PI>5 1</PI><End>10 0</End></Line>",
+         "5:1: PI is 5.0000 1.0000 in the file, but the tangents of the element are parallel", "a line has no PI"},
         {"<Line staStart='5'><Start>0 0</Start><End>10 0</End></Line>",
          "5:1: staStart is 5.0000 in the file, but 0.0000 by its geometry", "a station"},
         {"<Line><Start>0 0</Start><End>10 0</End></Line>\n<Line><Start>10.5 0</Start><End>20 0</End></Line>",
-         "6:1: the element begins 0.5000 from the end of the element before", "a gap"},
+         "6:1: the element begins 0.5000 from the end of the element before: at 10.5000 0.0000, but that ends at 10.0000 "
+         "0.0000",
+         "a gap"},
         {"<Line><Start>0 0</Start><End>10 0</End></Line>\n<Line><Start>10 0</Start><End>10 0</End></Line>",
          "6:1: the element has no length and was left out", "nothing"},
     };
@@ -196,6 +208,68 @@ TEST(LandXmlElements, TheToleranceIsTheJobs)
     LandXmlFile file(fileOf(alignment("<Line length='10.003'><Start>0 0</Start><End>10 0</End></Line>")), query);
     file.rows();
     EXPECT_EQ(file.notes(), QStringList());
+}
+
+TEST(LandXmlElements, TheToleranceOfDirectionsIsTheJobs)
+{
+    struct Row
+    {
+        const char *direction;
+        double cc;
+        qsizetype notes;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {"90.0006", 10, 0, "6.7 cc, as it is without the job's"},
+        {"90.0006", 5, 1, "a tighter one"},
+        {"90.002", 10, 1, "22 cc, as it is without the job's"},
+        {"90.002", 30, 0, "a looser one"},
+    };
+    for (const Row &row : rows) {
+        LandXmlQuery query = queryOf(Kind::Elements);
+        query.tolerance.angle = row.cc * pi / 2e6;
+        LandXmlFile file(fileOf(alignment(QByteArray("<Line dir='") + row.direction +
+                                          "'><Start>0 0</Start><End>0 2000</End></Line>")),
+                         query);
+        file.rows();
+        EXPECT_EQ(file.notes().size(), row.notes) << row.reason;
+    }
+}
+
+TEST(LandXmlElements, HaveTheValuesThatTheFileStatesWhereTheyDiffer)
+{
+    const QStringList names = {QStringLiteral("Radius"),        QStringLiteral("EndNorthing"),
+                               QStringLiteral("EndEasting"),    QStringLiteral("CentreNorthing"),
+                               QStringLiteral("CentreEasting"), QStringLiteral("PINorthing"),
+                               QStringLiteral("PIEasting")};
+    struct Row
+    {
+        const char *curve;
+        const char *row;
+        qsizetype notes;
+        const char *reason;
+    };
+    constexpr Row rows[] = {
+        {"radius='100.01'><Start>1100 500</Start><Center>1100 600</Center><End>1200.02 600</End><PI>1200 500.03</PI>",
+         "100.010|1200.020|600.000|1100.000|600.000|1200.000|500.030", 3, "all of them are stated"},
+        {"length='157.08'><Start>1100 500</Start><Center>1100 600</Center><End>1200 600</End>",
+         "100.000|1200.000|600.000|1100.000|600.000|1200.000|500.000", 0, "the radius and the PI are computed"},
+        {"radius='100' length='157.08'><Start>1100 500</Start><End>1200 600</End>",
+         "100.000|1200.000|600.000|1100.000|600.000|1200.000|500.000", 0, "and the centre"},
+        {"radius='100'><Start>1100 500</Start><Center>1100 600</Center><End>1100 700</End><PI>9000 600</PI>",
+         "100.000|1100.000|700.000|1100.000|600.000|9000.000|600.000", 1, "the PI of half a circle"},
+    };
+    for (const Row &row : rows) {
+        LandXmlFile file(fileOf(alignment(QByteArray("<Curve rot='cw' ") + row.curve + "</Curve>")),
+                         queryOf(Kind::Elements), names);
+        EXPECT_EQ(file.rows(3), QStringList(QLatin1StringView(row.row))) << row.reason;
+        EXPECT_EQ(file.notes().size(), row.notes) << row.reason << file.notes().join(u'\n').toStdString();
+    }
+    const PlaneCurve made = curve(TransitionForm::Clothoid, {100, 200}, 0, 62.5, 0, 1 / 250.0);
+    QByteArray moved = spiral(made, "clothoid");
+    moved.replace(number(made.end().point.northing), number(made.end().point.northing + 0.5));
+    LandXmlFile transition(fileOf(alignment(moved)), queryOf(Kind::Elements), {QStringLiteral("EndNorthing")});
+    EXPECT_NEAR(transition.number(0, "EndNorthing"), made.end().point.northing + 0.5, 1e-7);
 }
 
 TEST(LandXmlElements, DirectionsMayBeMeasuredInEachOfTheWaysThatProgramsKnow)

@@ -147,6 +147,17 @@ TEST(LandXmlPoints, NamesThatOccurTwiceAreNoted)
         EXPECT_EQ(file.rows().size(), 4) << "each is a row";
         EXPECT_EQ(file.notes(), QStringList(QStringLiteral("5:1: several points have the name \"1\""))) << round;
     }
+    LandXmlFile surface(
+        fileOf("<Surfaces><Surface name='ground'><Definition><Pnts><P id='1'>1 2 3</P>\n<P id='1'>4 5 6</P></Pnts>"
+               "</Definition></Surface></Surfaces>"),
+        queryOf(Kind::SurfacePoints), {QStringLiteral("Name"), QStringLiteral("Northing")});
+    EXPECT_EQ(surface.rows(0), QStringList({u"1|1"_qs, u"1|4"_qs}));
+    EXPECT_EQ(surface.notes(), QStringList(u"5:1: several points have the name \"1\""_qs));
+    LandXmlFile identifiers(
+        fileOf("<CgPoints><CgPoint oID='7'>1 1</CgPoint>\n<CgPoint oID='7'>2 2</CgPoint></CgPoints>"),
+        queryOf(Kind::Points), {QStringLiteral("Name"), QStringLiteral("Northing")});
+    EXPECT_EQ(identifiers.rows(0), QStringList({u"7|1"_qs, u"7|2"_qs}));
+    EXPECT_EQ(identifiers.notes(), QStringList(u"5:1: several points have the name \"7\""_qs));
 }
 
 TEST(LandXmlPoints, MistakesHaveTheirPlaceAndRowsBeforeThemAreRead)

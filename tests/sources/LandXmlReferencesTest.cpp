@@ -68,6 +68,54 @@ TEST(LandXmlReferences, ANameThatSeveralPointsHaveIsNotedWhereItIsReferredTo)
     EXPECT_EQ(parcels.notes(), QStringList(u"6:18: "_qs + note));
 }
 
+TEST(LandXmlReferences, AnIdentifierThatSeveralPointsHaveIsNotedWhereItIsReferredTo)
+{
+    const QByteArray twice = "<CgPoints><CgPoint name='x' oID='7'>1 1</CgPoint><CgPoint name='y' oID='7'>2 2</CgPoint>"
+                             "</CgPoints>\n";
+    LandXmlFile elements(fileOf(twice + alignment("<Line><Start pntRef='7'/><End>9 9</End></Line>")),
+                         queryOf(Kind::Elements), {QStringLiteral("StartPoint"), QStringLiteral("StartNorthing")});
+    EXPECT_EQ(elements.rows(0), QStringList(u"x|1"_qs));
+    EXPECT_EQ(elements.notes(),
+              QStringList(u"6:7: several points have the name \"7\" that is referred to: the first one was taken"_qs));
+    LandXmlFile listed(fileOf(twice), queryOf(Kind::Points), {QStringLiteral("Name")});
+    EXPECT_EQ(listed.rows(), QStringList({u"x"_qs, u"y"_qs}));
+    EXPECT_EQ(listed.notes(), QStringList()) << "nothing depends on it";
+}
+
+TEST(LandXmlReferences, PointsWithoutContentDoNotFillTheMemory)
+{
+    const QByteArray road = alignment("<Line><Start pntRef='1'/><End pntRef='2'/></Line>");
+    QByteArray named = "<CgPoints>";
+    for (int i = 0; i < 60000; ++i) {
+        named += "<CgPoint name='" + QByteArray::number(i) + "'>" + QByteArray::number(i) + " 0</CgPoint>";
+    }
+    named += "</CgPoints>";
+    struct Row
+    {
+        QByteArray points;
+        bool isRead;
+        const char *reason;
+    };
+    const QByteArray two = "<CgPoints><CgPoint name='1'>1 0</CgPoint><CgPoint name='2'>2 0</CgPoint></CgPoints>";
+    const Row rows[] = {
+        {two + "<CgPoints>" + QByteArray("<CgPoint name='a'/>").repeated(150000) + "</CgPoints>", false,
+         "each would take twenty times its bytes"},
+        {two + "<CgPoints>" + QByteArray("<CgPoint name='a'/>").repeated(50000) + "</CgPoints>", true,
+         "some are no harm"},
+        {two + "<CgPoints>" + QByteArray("<CgPoint/>").repeated(150000) + "</CgPoints>", true,
+         "nothing refers to one without a name, and it is not kept"},
+        {named, true, "what a program writes at the least"},
+    };
+    for (const Row &row : rows) {
+        LandXmlFile file(fileOf(road + row.points), queryOf(Kind::Elements), {QStringLiteral("EndNorthing")});
+        EXPECT_EQ(file.rows(0), row.isRead ? QStringList(u"2"_qs) : QStringList()) << row.reason;
+        ASSERT_EQ(file.list->error().has_value(), !row.isRead) << row.reason;
+        if (!row.isRead) {
+            EXPECT_TRUE(file.list->error()->text.contains(u"too many elements without content")) << row.reason;
+        }
+    }
+}
+
 TEST(LandXmlReferences, TheCentreOfAParcelMayBeAPoint)
 {
     const QStringList variables = {QStringLiteral("CentreNorthing"), QStringLiteral("CentreEasting")};

@@ -56,6 +56,7 @@ TEST(LandXmlTangents, OfAMirroredElementAreNoted)
     const QStringList arc = notesOf(road(1, "ccw"));
     ASSERT_EQ(arc.size(), 2) << arc.join(u'\n').toStdString();
     EXPECT_TRUE(arc[0].startsWith(u"7:1: the element begins at an angle of 22.9")) << arc[0].toStdString();
+    EXPECT_TRUE(arc[0].contains(u" after 8.59437: ")) << arc[0].toStdString();
     EXPECT_TRUE(arc[0].endsWith(u"perhaps one of them bends to the other side")) << arc[0].toStdString();
     EXPECT_TRUE(arc[1].startsWith(u"8:1: ")) << "where the one after it begins";
     const QStringList clothoid = notesOf(road(1, "cw", "ccw"));
