@@ -32,7 +32,7 @@ TableGroups GroupBinding::bind(const TableShape &shape, const std::vector<unsign
         checkSort(shape, sortIds);
     }
     if (shape.rounding && groups_.variables.empty()) {
-        lookup_.fail(*shape.rounding, Xlate("\"rounding\" goes with totals: a total was expected in the step"));
+        lookup_.fail(*shape.rounding, Xlate("\"rounding\" was expected only with totals"));
     }
     return std::move(groups_);
 }

@@ -2079,8 +2079,8 @@
     </message>
     <message>
         <location filename="../jobs/GroupBinding.cpp"/>
-        <source>"rounding" goes with totals: a total was expected in the step</source>
-        <translation>"rounding" gehört zu Summen: eine Summe wurde im Schritt erwartet</translation>
+        <source>"rounding" was expected only with totals</source>
+        <translation>"rounding" wurde nur mit Summen erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/GroupBinding.cpp"/>

@@ -2079,8 +2079,8 @@
     </message>
     <message>
         <location filename="../jobs/GroupBinding.cpp"/>
-        <source>"rounding" goes with totals: a total was expected in the step</source>
-        <translation>"rounding" は集計とともに使います: ステップに集計が必要です</translation>
+        <source>"rounding" was expected only with totals</source>
+        <translation>"rounding" は集計と一緒にだけ使えます</translation>
     </message>
     <message>
         <location filename="../jobs/GroupBinding.cpp"/>

@@ -109,10 +109,6 @@ QLayout *TemplateDialog::makeForm()
                Xlate("Data (*.csv *.txt *.xml *.landxml *.gpkg *.sqlite *.db);;All files (*)"));
     });
     connect(browseServer, &QPushButton::clicked, this, [this] { chooseServer(); });
-    askServer = [this](const QString &connection) -> std::optional<ServerTables> {
-        ServerDialog dialog(connection, this);
-        return dialog.exec() == QDialog::Accepted ? std::optional(dialog.tables()) : std::nullopt;
-    };
     return form;
 }
 

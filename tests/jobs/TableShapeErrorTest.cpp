@@ -105,9 +105,9 @@ TEST(TableShapeError, OfTotals)
         {R"("totals": [{"label": "{Number}"}])", R"("{Number}")",
          "unknown placeholder {Number}: one of {count}, {sum:...}, {mean:...}, {min:...}, {max:...}, {count:...}, {lengthUnit}, {areaUnit}, {angleUnit} was expected"},
         {R"("rounding": "up", "totals": [])", R"("up")", "one of exact, printed was expected"},
-        {R"("rounding": "printed")", R"("printed")", "\"rounding\" goes with totals: a total was expected in the step"},
+        {R"("rounding": "printed")", R"("printed")", "\"rounding\" was expected only with totals"},
         {R"("rounding": "exact", "sort": "Note", "groups": [{"by": "Note", "heading": "{count} {Note}"}], "totals": [{"label": "end"}])",
-         R"("exact")", "\"rounding\" goes with totals: a total was expected in the step"},
+         R"("exact")", "\"rounding\" was expected only with totals"},
     };
     expectErrors(rows);
 }

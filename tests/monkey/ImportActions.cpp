@@ -52,7 +52,7 @@ QByteArray pointsTemplate()
         variables += "\t\t\t\t<Variable><ID>" + QByteArray::number(++id) + "</ID><VariableName>" + name +
                      "</VariableName><Type>" + (isText ? "TEXT" : "COORDINATE") + "</Type></Variable>\n";
     }
-    return "<ReportTemplate>\n\t<Name>P</Name>\n\t<Title>Points</Title>\n\t<Tables>\n\t\t<Table>\n\t\t\t<Name>All</Name>"
+    return "<ReportTemplate>\n\t<Name>P</Name>\n\t<Title>Points</Title>\n\t<Options><Separator>124</Separator></Options>\n\t<Tables>\n\t\t<Table>\n\t\t\t<Name>All</Name>"
            "<Use>D</Use>\n\t\t\t<OutputList>\n" +
            fields +
            "\t\t\t</OutputList>\n\t\t</Table>\n\t</Tables>\n\t<Blocks>\n\t\t<Block>\n\t\t\t<Name>First</Name>"

@@ -3,6 +3,7 @@
 #include "ImportTables.h"
 #include "PostgresPreview.h"
 #include "SqlitePreview.h"
+#include "StandardText.h"
 #include "WorkAside.h"
 #include "Xlate.h"
 
@@ -111,16 +112,16 @@ private:
     Expected<PostgresSample> read(const QString &table) const
     {
         const auto result = std::make_shared<Expected<PostgresSample>>();
-        const bool isDone = doAside(
-            Xlate("Reading %1").arg(table), UserInput::Kept,
-            [result, connection = connection_, sql = sqlOf(table)](AsideState &state) {
-                state.setPercent(-1); // nobody knows how long it takes
-                try {
-                    *result = readPostgresSample(connection, sql, mostRowsRead, [&state] { return state.isStopped(); });
-                } catch (const std::bad_alloc &) {
-                    *result = InputError{connection, std::nullopt, Xlate("there is not enough memory for it")};
-                }
-            });
+        const bool isDone = doAside(Xlate("Reading %1").arg(table), UserInput::Kept,
+                                    [result, connection = connection_, sql = sqlOf(table)](AsideState &state) {
+                                        state.setPercent(-1); // nobody knows how long it takes
+                                        try {
+                                            *result = readPostgresSample(connection, sql, mostRowsRead,
+                                                                         [&state] { return state.isStopped(); });
+                                        } catch (const std::bad_alloc &) {
+                                            *result = InputError{connection, std::nullopt, noMemoryText()};
+                                        }
+                                    });
         if (!isDone) {
             return InputError{connection_, std::nullopt, Xlate("the table was not read. Choose it again to read it")};
         }

@@ -3,6 +3,7 @@
 #include "ConnectionWords.h"
 #include "PlainWidgets.h"
 #include "Readable.h"
+#include "StandardText.h"
 #include "WorkAside.h"
 #include "Xlate.h"
 
@@ -137,7 +138,7 @@ void ServerDialog::accept()
             try {
                 *read = postgresTables(wanted, [&state] { return state.isStopped(); });
             } catch (const std::bad_alloc &) {
-                *read = InputError{QString(), std::nullopt, Xlate("there is not enough memory for it")};
+                *read = InputError{QString(), std::nullopt, noMemoryText()};
             }
         });
     if (!isDone) {
