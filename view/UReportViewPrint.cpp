@@ -21,6 +21,7 @@
 #include <QTextDocument>
 
 #include <memory>
+#include <tuple>
 #include <utility>
 
 namespace
@@ -119,8 +120,14 @@ QString nameOf(const QPrinter &printer)
 bool UReportView::measureRoom()
 {
     UReportDoc &report = *GetDocument();
+    const auto page = [&report] {
+        return std::tuple(report.GetPageSize(), report.GetLinesPerPage(), report.GetCharsPerRow());
+    };
+    const auto before = page();
     const int isMeasured = report.SetPageSize();
-    showMeasuredPage();
+    if (page() != before) {
+        showMeasuredPage();
+    }
     if (isMeasured == 0) {
         return true;
     }
