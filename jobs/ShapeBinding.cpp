@@ -166,7 +166,7 @@ void Binding::bindRunning(const TableShape::Running &running)
     const bool isRowNumber = running.kind == Kind::RowNumber;
     if (running.perGroup && shape_.groups.empty()) {
         lookup_.fail(running.path,
-                     Xlate("\"per\": \"group\" goes with groups: the key \"groups\" was expected in the step"));
+                     Xlate("\"per\": \"group\" needs groups: the key \"groups\" was expected in the step"));
     }
     if (!isRowNumber) {
         of = lookup_.find(running.of);

@@ -228,7 +228,7 @@ TableShape::Group readGroup(const JsonNode &node)
     }
     for (const char *key : {"before", "keep", "newPage"}) {
         if (const JsonNode one = node[QLatin1StringView(key)]; one.exists() && !group.heading) {
-            one.fail(Xlate("\"%1\" goes with a heading: the key \"heading\" was expected").arg(QLatin1StringView(key)));
+            one.fail(Xlate("\"%1\" needs a heading: the key \"heading\" was expected").arg(QLatin1StringView(key)));
         }
     }
     group.totals = readTotals(node[QStringLiteral("totals")]);

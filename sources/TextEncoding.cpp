@@ -112,7 +112,7 @@ QString wrongCharacter(TextEncoding encoding)
 {
     return encoding == TextEncoding::Utf16
                ? Xlate("the file is not UTF-16")
-               : Xlate("the file is not Windows-1252: it has a byte that stands for no character");
+               : Xlate("the file is not Windows-1252: it contains a byte that this encoding does not use");
 }
 
 } // namespace

@@ -1053,8 +1053,8 @@
     </message>
     <message>
         <location filename="../sources/TextEncoding.cpp"/>
-        <source>the file is not Windows-1252: it has a byte that stands for no character</source>
-        <translation>die Datei ist nicht Windows-1252: sie hat ein Byte, das dort kein Zeichen ist</translation>
+        <source>the file is not Windows-1252: it contains a byte that this encoding does not use</source>
+        <translation>die Datei ist nicht Windows-1252: sie enthält ein Byte, das diese Codierung nicht verwendet</translation>
     </message>
     <message>
         <location filename="../sources/TextEncoding.cpp"/>
@@ -2609,8 +2609,8 @@
     </message>
     <message>
         <location filename="../jobs/ShapeBinding.cpp"/>
-        <source>"per": "group" goes with groups: the key "groups" was expected in the step</source>
-        <translation>"per": "group" gehört zu Gruppen: der Schlüssel "groups" wurde im Schritt erwartet</translation>
+        <source>"per": "group" needs groups: the key "groups" was expected in the step</source>
+        <translation>"per": "group" braucht Gruppen: im Schritt wurde der Schlüssel "groups" erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/ShapeBinding.cpp"/>
@@ -2684,8 +2684,8 @@
     </message>
     <message>
         <location filename="../jobs/TableShapeReader.cpp"/>
-        <source>"%1" goes with a heading: the key "heading" was expected</source>
-        <translation>"%1" gehört zu einer Überschrift: der Schlüssel "heading" wurde erwartet</translation>
+        <source>"%1" needs a heading: the key "heading" was expected</source>
+        <translation>"%1" braucht eine Überschrift: der Schlüssel "heading" wurde erwartet</translation>
     </message>
     <message>
         <location filename="../jobs/TemplateSource.cpp"/>

@@ -1053,8 +1053,8 @@
     </message>
     <message>
         <location filename="../sources/TextEncoding.cpp"/>
-        <source>the file is not Windows-1252: it has a byte that stands for no character</source>
-        <translation>ファイルは Windows-1252 ではありません: 文字でないバイトがあります</translation>
+        <source>the file is not Windows-1252: it contains a byte that this encoding does not use</source>
+        <translation>ファイルは Windows-1252 ではありません: この文字コードで使われないバイトが含まれています</translation>
     </message>
     <message>
         <location filename="../sources/TextEncoding.cpp"/>
@@ -2609,8 +2609,8 @@
     </message>
     <message>
         <location filename="../jobs/ShapeBinding.cpp"/>
-        <source>"per": "group" goes with groups: the key "groups" was expected in the step</source>
-        <translation>"per": "group" はグループとともに使います: ステップにキー "groups" が必要です</translation>
+        <source>"per": "group" needs groups: the key "groups" was expected in the step</source>
+        <translation>"per": "group" にはグループが必要です: ステップに "groups" キーが必要です</translation>
     </message>
     <message>
         <location filename="../jobs/ShapeBinding.cpp"/>
@@ -2684,8 +2684,8 @@
     </message>
     <message>
         <location filename="../jobs/TableShapeReader.cpp"/>
-        <source>"%1" goes with a heading: the key "heading" was expected</source>
-        <translation>"%1" は見出しとともに使います: キー "heading" が必要です</translation>
+        <source>"%1" needs a heading: the key "heading" was expected</source>
+        <translation>"%1" には見出しが必要です: "heading" キーが必要です</translation>
     </message>
     <message>
         <location filename="../jobs/TemplateSource.cpp"/>

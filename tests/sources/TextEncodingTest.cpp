@@ -84,7 +84,7 @@ TEST(TextEncoding, EveryEncodingReads)
         {TextEncoding::Utf16, utf16(QStringLiteral("Number\n1") + QChar(0xDD1E), true),
          "error 2:2 the file is not UTF-16", "the other half"},
         {TextEncoding::Windows1252, "Number\n1\x81\n",
-         "error 2:2 the file is not Windows-1252: it has a byte that stands for no character",
+         "error 2:2 the file is not Windows-1252: it contains a byte that this encoding does not use",
          "a byte without a character"},
         {TextEncoding::Latin1, "Number,Count\n\xF6,x\n",
          "error 2:3 the cell \"x\" of the column \"Count\" does not fit: a whole number was expected",
