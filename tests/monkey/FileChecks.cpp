@@ -229,7 +229,7 @@ QString World::editOpened(const QString &copy, Chance &chance)
 {
     UReportView *view = viewWithKeyboard();
     if (view == nullptr || view->GetDocument() == nullptr || view->GetDocument()->GetPathName() != copy ||
-        !isRich(*view->GetDocument()))
+        !isRich(*view->GetDocument()) || !view->GetEdit().hasFocus()) // sheets take no text
     {
         return {};
     }
