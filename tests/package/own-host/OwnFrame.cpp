@@ -301,6 +301,7 @@ QAction *UXTPMDIFrameWnd::AddCommand(QMenu & /*menu*/, unsigned /*id*/, const QS
 }
 
 void UXTPMDIFrameWnd::DockPane(COneViewPane & /*pane*/) {}
+void UXTPMDIFrameWnd::DockBar(COneViewPane & /*pane*/, Qt::DockWidgetArea /*area*/) {}
 void UXTPMDIFrameWnd::SettlePanes() {}
 void UXTPMDIFrameWnd::UpdateCommands() {}
 
