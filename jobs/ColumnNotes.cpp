@@ -107,11 +107,12 @@ QString ColumnComparison::columnQuestion(const QString &name) const
     });
 }
 
-std::vector<JobNote> ColumnComparison::unknownColumns() const
+std::vector<JobNote> ColumnComparison::unknownColumns(const AtName &atName) const
 {
     std::vector<JobNote> notes;
     std::size_t more = 0;
-    for (const SourceColumn &column : columns_.columns) {
+    for (std::size_t i = 0; i < columns_.columns.size(); ++i) {
+        const SourceColumn &column = columns_.columns[i];
         if (!isUnknown(column)) {
             continue;
         }
@@ -121,9 +122,10 @@ std::vector<JobNote> ColumnComparison::unknownColumns() const
         }
         const QString sentence = Xlate("the column \"%1\" is not a variable of the dictionary \"%2\"")
                                      .arg(column.name, dictionary_.DictionaryName);
-        notes.push_back(
-            {JobNote::Kind::UnknownColumn,
-             InputError{columns_.source, column.place, joinedQuestion(sentence, variableQuestion(column.name))}});
+        const QString text = joinedQuestion(sentence, variableQuestion(column.name));
+        notes.push_back({JobNote::Kind::UnknownColumn, column.namer == ColumnNamer::Data
+                                                           ? InputError{columns_.source, column.place, text}
+                                                           : atName(column.namer, i, text)});
     }
     if (more > 0) {
         const QString sentence = more == 1 ? Xlate("%1 more column is not a variable of the dictionary \"%2\"")

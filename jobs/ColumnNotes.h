@@ -12,6 +12,8 @@
 #include <QString>
 #include <QStringList>
 
+#include <cstddef>
+#include <functional>
 #include <optional>
 #include <vector>
 
@@ -54,8 +56,10 @@ public:
     /// Whether a variable is read from a column.
     bool isRead(const QString &variable) const;
 
+    /// Says something about a name that the job gives to a column, with its place there. @param column  its index
+    using AtName = std::function<InputError(ColumnNamer namer, std::size_t column, const QString &text)>;
     /// Notes on the columns that are not variables of the dictionary. Of very many, the last note says how many more there are.
-    std::vector<JobNote> unknownColumns() const;
+    std::vector<JobNote> unknownColumns(const AtName &atName) const;
 
     /// The keys of the units that numbers of the data are taken to be in, as the job does not say them.
     QStringList assumedUnits(const DataUnits &units) const;

@@ -33,7 +33,17 @@ JobSteps::Wrong JobSteps::noteColumns(const SourceColumns &columns, const QStrin
     const QString pair = record.use + QChar() + data;
     const bool isNew = !comparedData_.contains(pair); // the notes of another step on them are there already
     comparedData_.insert(pair);
-    auto wrong = isNew ? notes_.add(compared.unknownColumns()) : std::nullopt;
+    const auto atName = [&](ColumnNamer namer, std::size_t column, const QString &text) {
+        JsonPath path = {QStringLiteral("data"), data};
+        if (namer == ColumnNamer::Order) {
+            path.emplace_back(QStringLiteral("order"));
+        } else {
+            path.emplace_back(QStringLiteral("columns"));
+            path.emplace_back(static_cast<qsizetype>(column));
+        }
+        return source_.errorAt(path, text);
+    };
+    auto wrong = isNew ? notes_.add(compared.unknownColumns(atName)) : std::nullopt;
     for (const UnfilledField &field : compared.unfilledFields(record.fields)) {
         wrong = firstOf(wrong, noteField(field, record));
     }

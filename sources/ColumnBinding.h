@@ -31,6 +31,14 @@ struct ColumnChoice
     std::variant<QString, int> column;
 };
 
+/// Who names a column.
+enum class ColumnNamer
+{
+    Data,  ///< the data itself, or nobody
+    List,  ///< the list of columns that the user gave, which has a name for each column
+    Order, ///< the order of columns that the user gave
+};
+
 /// A column of a data set.
 struct SourceColumn
 {
@@ -38,6 +46,7 @@ struct SourceColumn
     std::optional<TextPlace> place; ///< of the name in the file
     bool isKnown = false;           ///< some variable is read from it
     bool isOffered = false;         ///< it is not a column of values of the data itself, so that it need not be read
+    ColumnNamer namer = ColumnNamer::Data; ///< where it is not the data, the name has no place there
 };
 
 /// A variable that is read from a column.

@@ -1868,6 +1868,11 @@
         <translation>(Zeichen %1 der Abfrage)</translation>
     </message>
     <message>
+        <location filename="../sources/postgresql/PostgresRows.cpp"/>
+        <source>a point was expected instead of %1</source>
+        <translation>ein Punkt wurde erwartet, nicht %1</translation>
+    </message>
+    <message>
         <location filename="../sources/postgresql/PostgresRowsColumns.cpp"/>
         <source>the query has %1 parameters: values of %2 are given</source>
         <translation>die Abfrage hat %1 Parameter: Werte von %2 sind angegeben</translation>
@@ -1876,6 +1881,11 @@
         <location filename="../sources/postgresql/PostgresRowsColumns.cpp"/>
         <source>the query is not a single SELECT, which was expected</source>
         <translation>die Abfrage ist kein einzelnes SELECT, wie es erwartet wurde</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteColumns.cpp"/>
+        <source>the database has no tables: the table "%1" was expected</source>
+        <translation>die Datenbank hat keine Tabellen: die Tabelle "%1" wurde erwartet</translation>
     </message>
     <message>
         <location filename="../sources/sqlite/SqliteColumns.cpp"/>

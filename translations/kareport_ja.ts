@@ -1868,6 +1868,11 @@
         <translation>(クエリの %1 文字目)</translation>
     </message>
     <message>
+        <location filename="../sources/postgresql/PostgresRows.cpp"/>
+        <source>a point was expected instead of %1</source>
+        <translation>点が必要ですが、%1 があります</translation>
+    </message>
+    <message>
         <location filename="../sources/postgresql/PostgresRowsColumns.cpp"/>
         <source>the query has %1 parameters: values of %2 are given</source>
         <translation>クエリにはパラメーターが %1 個あります: 与えられた値は %2 個です</translation>
@@ -1876,6 +1881,11 @@
         <location filename="../sources/postgresql/PostgresRowsColumns.cpp"/>
         <source>the query is not a single SELECT, which was expected</source>
         <translation>クエリは単一の SELECT ではありません。単一の SELECT が必要です</translation>
+    </message>
+    <message>
+        <location filename="../sources/sqlite/SqliteColumns.cpp"/>
+        <source>the database has no tables: the table "%1" was expected</source>
+        <translation>データベースに表がありません: 表 "%1" が必要です</translation>
     </message>
     <message>
         <location filename="../sources/sqlite/SqliteColumns.cpp"/>

@@ -67,6 +67,7 @@ bool CsvRows::readColumns(const CsvDialect &dialect)
             column.place = places[i];
         } else if (names) {
             column.name = (*names)[static_cast<qsizetype>(i)];
+            column.namer = dialect.names.isEmpty() ? ColumnNamer::Order : ColumnNamer::List;
         }
     }
     // A file without a row has as many columns as are asked for.

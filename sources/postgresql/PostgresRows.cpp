@@ -130,7 +130,7 @@ bool PostgresRows::readGeometry(const PGresult *row)
     rowBytes_ += text.size();
     const PointOrFault read = parseHexPoint(text);
     if (const QString *instead = std::get_if<QString>(&read)) {
-        return failInRow(Xlate("there is %1: a point was expected").arg(*instead));
+        return failInRow(Xlate("a point was expected instead of %1").arg(*instead));
     }
     point_ = std::get<PointGeometry>(read);
     return true;

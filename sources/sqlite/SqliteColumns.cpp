@@ -28,10 +28,11 @@ bool SqliteRows::prepareAll(const SqliteQuery &query)
         const QStringList tables = file_->tables();
         const bool isThere = file_->prepare(QStringLiteral("SELECT * FROM ") + quoted(query.table)) != nullptr;
         if (!isThere && !tables.contains(query.table, Qt::CaseInsensitive)) {
-            const QString sentence = Xlate("the database has no table \"%1\"").arg(query.table);
-            error_ = InputError{query.file, std::nullopt,
-                                tables.isEmpty() ? sentence + QStringLiteral(": ") + oneOfExpected(query.table, tables)
-                                                 : withExpected(sentence, query.table, tables)};
+            error_ = InputError{
+                query.file, std::nullopt,
+                tables.isEmpty()
+                    ? Xlate("the database has no tables: the table \"%1\" was expected").arg(query.table)
+                    : withExpected(Xlate("the database has no table \"%1\"").arg(query.table), query.table, tables)};
             return false;
         }
     }

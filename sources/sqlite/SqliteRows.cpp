@@ -112,7 +112,7 @@ bool SqliteRows::readGeometry()
     rowBytes_ += static_cast<std::size_t>(size);
     const PointOrFault read = parseGeoPackagePoint({bytes, bytes != nullptr ? static_cast<std::size_t>(size) : 0});
     if (const QString *instead = std::get_if<QString>(&read)) {
-        return failInRow(Xlate("there is %1: a point was expected").arg(*instead));
+        return failInRow(Xlate("a point was expected instead of %1").arg(*instead));
     }
     point_ = std::get<PointGeometry>(read);
     return true;

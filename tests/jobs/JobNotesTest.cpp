@@ -32,6 +32,9 @@ void putData(const TestJob &job)
     job.folder.put("misspelt.csv", "Number,Nrothing\n1,12.5\n");
     job.folder.put("wide.csv", "Number,Northing\n123456,1\n");
     job.folder.put("more.csv", "Number,Northing,\"Code\"\n1,12.5,x\n");
+    job.folder.put("pnez.csv", "1,12.5,3,4\n");
+    job.folder.put("empty.csv", "Number,Northing\n1,\n");
+    job.folder.put("infinite.csv", "Number,Northing\n1,-INF\n");
     job.folder.put("twice.csv", "Number,Northing,N\n1,12.5,13\n");
     job.folder.put("points.json",
                    "[{\"Number\": 1,\n  \"Code\": 5, \"Northing\": 1},\n {\"Number\": 2, \"Northing\": 2}]");
@@ -63,8 +66,11 @@ TEST(JobNotes, SayWhatDoesNotComeTogether)
         {R"("csv": "more.csv")", R"({"table": "Points", "data": "p"}, {"table": "Sorted", "data": "p"})",
          "more.csv:1:17: note: the column \"Code\" is not a variable of the dictionary \"Survey\"", "said once"},
         {R"("csv": "more.csv", "columns": ["Number", "Northing", "Cod"])", tableStep,
-         "more.csv: note: the column \"Cod\" is not a variable of the dictionary \"Survey\"",
-         "a name that the job gives"},
+         "job.json:1:#: note: the column \"Cod\" is not a variable of the dictionary \"Survey\"",
+         "a name that the job gives has its place there"},
+        {R"("csv": "pnez.csv", "header": false, "order": "PNEZ")", tableStep,
+         "job.json:1:#: note: the column \"Elevation\" is not a variable of the dictionary \"Survey\"",
+         "a name of an order has the place of the order"},
         {R"("values": [{"Number": "1"}, {"Number": "2", "Nortihng": 2}])", tableStep,
          "job.json:1:#: note: the column \"Nortihng\" is not a variable of the dictionary \"Survey\": did you mean "
          "\"Northing\"?\n"
@@ -429,19 +435,28 @@ TEST(JobNotes, AreErrorsInAStrictJob)
         const char *set;
         bool isWrong;
         const char *reason;
+        const char *step = tableStep;
+        const char *more = "";
     };
+    constexpr const char *totalStep = R"({"table": "Points", "data": "p", "totals": [{"max": "Northing"}]})";
+    constexpr const char *zeroBlank = R"("options": {"zeroBlank": true}, )";
     constexpr Row rows[] = {
         {R"("csv": "good.csv")", false, "nothing to note"},
         {R"("csv": "misspelt.csv")", true, "known before the rows are read"},
         {R"("json": "points.json")", true, "known after them"},
         {R"("csv": "wide.csv")", true, "a value that does not fit"},
+        {R"("csv": "empty.csv")", true, "a number that is missing"},
+        {R"("csv": "infinite.csv")", true, "a number that is not finite"},
+        {R"("csv": "empty.csv")", false, "a number that shows as blanks, as it was asked for", tableStep, zeroBlank},
+        {R"("csv": "empty.csv")", true, "the same, in no total", totalStep, zeroBlank},
+        {R"("csv": "good.csv")", false, "a total of all values", totalStep, zeroBlank},
     };
     for (const Row &row : rows) {
         for (const bool isStrict : {true, false}) {
             TestJob job;
             putData(job);
-            job.run(templateJob(QByteArray(R"("p": {)") + row.set + "}", tableStep,
-                                isStrict ? "\"strict\": true, " : "\"strict\": false, "));
+            job.run(templateJob(QByteArray(R"("p": {)") + row.set + "}", row.step,
+                                QByteArray(row.more) + (isStrict ? R"("strict": true, )" : R"("strict": false, )")));
             EXPECT_EQ(job.error.has_value(), row.isWrong && isStrict) << row.reason;
             if (job.error) {
                 EXPECT_EQ(job.error->message(), job.notes.said().front().about.message()) << row.reason;

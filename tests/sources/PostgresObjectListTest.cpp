@@ -376,7 +376,7 @@ TEST_F(PostgresServer, PointsHaveCoordinates)
               "number=A easting=1")
         << "bytes that a query makes";
     EXPECT_EQ(rowsOf(query("SELECT * FROM lines", {}, {{"Easting", QStringLiteral("@x")}})),
-              "error row 1: there is a line string: a point was expected");
+              "error row 1: a point was expected instead of a line string");
     EXPECT_EQ(rowsOf(query("SELECT * FROM lines")), "number=A") << "where it is not asked for, it may be anything";
     EXPECT_EQ(rowsOf(query("SELECT number, geom, geom AS h FROM marks", {}, parts)),
               "error the columns \"geom\" and \"h\" both have geometries: a query with one of them was expected");

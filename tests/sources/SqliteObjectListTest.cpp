@@ -301,7 +301,7 @@ TEST(SqliteObjectList, FilesThatAreNotADatabase)
     ASSERT_TRUE(file.open(QIODevice::ReadOnly));
     const QByteArray whole = file.readAll();
     const Row rows[] = {
-        {"", "error the database has no table \"points\": one of none was expected", "an empty file"},
+        {"", "error the database has no tables: the table \"points\" was expected", "an empty file"},
         {"Number,Northing\n1,2\n", "error the file is not a SQLite database, or it is encrypted", "a text"},
         {encrypted, "error the file is not a SQLite database, or it is encrypted", "bytes without a sense"},
         {whole.left(1024), "error the database is broken: database disk image is malformed", "cut short"},
@@ -540,12 +540,12 @@ TEST(SqliteObjectList, WhatIsNotAPointIsSaid)
                             "(2, x'47500001000000000102000000" +
                             QByteArray(36, '0') + "', NULL, 2);");
     EXPECT_EQ(joined(rowsOf(database.table("lines", {{"Easting", QStringLiteral("@x")}}))),
-              "number=1 easting=1\nerror row 2: there is a line string: a point was expected");
+              "number=1 easting=1\nerror row 2: a point was expected instead of a line string");
     EXPECT_EQ(joined(rowsOf(database.table("lines"))), "number=1\nnumber=2")
         << "where it is not asked for, it may be anything";
     geo::runSql(database.path(), "UPDATE lines SET geom = 'text' WHERE fid = 2");
     EXPECT_EQ(joined(rowsOf(database.table("lines", {{"Easting", QStringLiteral("@x")}}))),
-              "number=1 easting=1\nerror row 2: there is bytes that are not a geometry: a point was expected");
+              "number=1 easting=1\nerror row 2: a point was expected instead of bytes that are not a geometry");
     geo::runSql(database.path(),
                 "INSERT INTO gpkg_geometry_columns VALUES ('lines', 'second', 'GEOMETRY', 25832, 0, 0)");
     EXPECT_EQ(joined(rowsOf(database.table("lines", {{"Easting", QStringLiteral("@x")}}))),
