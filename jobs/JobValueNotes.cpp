@@ -130,13 +130,7 @@ JobSteps::Wrong JobSteps::noteValue(const ColumnRemarks &column, bool isRead, Ro
 {
     using Kind = JobNote::Kind;
     Wrong wrong;
-    const auto note = [&](Kind kind, const ValueCount &values, const ValueSentences &sentences) {
-        if (values.count == 0) {
-            return;
-        }
-        const QString text = (values.count == 1 ? sentences.one : sentences.several)
-                                 .arg(QString::number(values.count), column.variable, record.what, record.name,
-                                      QString::number(values.firstRow), QString::number(values.firstLine));
+    const auto add = [&](Kind kind, const ValueCount &values, const QString &text) {
         JobNote found = {kind, source_.errorAt(record.path, text), values.firstLine, values.count, values.firstRow};
         if (&values != &column.wideTotals) { // a total has no place in the data
             const auto place = rows.placeOf(static_cast<std::size_t>(values.firstRow) - 1, column.variable);
@@ -144,6 +138,14 @@ JobSteps::Wrong JobSteps::noteValue(const ColumnRemarks &column, bool isRead, Ro
             found.dataPlace = place.place;
         }
         wrong = firstOf(wrong, notes_.add({found}));
+    };
+    const auto note = [&](Kind kind, const ValueCount &values, const ValueSentences &sentences) {
+        if (values.count > 0) {
+            const QString &sentence = values.count == 1 ? sentences.one : sentences.several;
+            add(kind, values,
+                sentence.arg(QString::number(values.count), column.variable, record.what, record.name,
+                             QString::number(values.firstRow), QString::number(values.firstLine)));
+        }
     };
     const bool hasHash = job_.options.printHash;
     note(Kind::WideValue, column.tooWide, hasHash ? hashSentences() : wideSentences());
@@ -153,6 +155,11 @@ JobSteps::Wrong JobSteps::noteValue(const ColumnRemarks &column, bool isRead, Ro
     if (isRead) {
         note(Kind::MissingValue, column.missing, zeroSentences());
         note(Kind::BlankValue, column.blank, blankSentences());
+        if (column.unwritten.count > 0) {
+            add(column.isBlankAsked ? Kind::BlankValue : Kind::MissingValue, column.unwritten,
+                Xlate("the field \"%1\" of the %2 \"%3\" has no value: its line is left out")
+                    .arg(column.variable, record.what, record.name));
+        }
     }
     return wrong;
 }

@@ -20,19 +20,28 @@ struct ValueCount
     qint64 firstLine = 0; ///< of the report, from 1
 };
 
+// Keeps a function that is called for remarks alone one of its own: the benchmarks count its instructions by its name.
+#ifdef KAREPORT_COUNTS_REMARKS
+#define KA_REMARK [[gnu::noinline]]
+#else
+#define KA_REMARK
+#endif
+
 /// What a column of a table, or a line of a block, does not show as it is.
 struct ColumnRemarks
 {
-    QString variable;      ///< the name of the variable that the column shows
-    ValueCount tooWide;    ///< values wider than the column, which is then wider, or shows "#"
-    ValueCount missing;    ///< values that are not there and show as 0
-    ValueCount blank;      ///< numbers that are not there and show as blanks, as asked for
-    ValueCount notFinite;  ///< values that are infinite or not-a-number
-    ValueCount wideTotals; ///< totals wider than the column, with the last row above them
-    quint64 wideZeros = 0; ///< how many of the missing values show as a 0 that is wider than the column
-    WidestText widest;     ///< the widest value, where it is asked for
-    quint64 widestRow = 0; ///< of the table, from 1; 0 for none
-    qint64 widestLine = 0; ///< of the report, from 1
+    QString variable;          ///< the name of the variable that the column shows
+    ValueCount tooWide;        ///< values wider than the column, which is then wider, or shows "#"
+    ValueCount missing;        ///< values that are not there and show as 0
+    ValueCount blank;          ///< numbers that are not there and show as blanks, as asked for
+    ValueCount unwritten;      ///< numbers that are not there, so that the lines of a block that show them are left out
+    bool isBlankAsked = false; ///< such numbers were not to show, as blanks are asked for
+    ValueCount notFinite;      ///< values that are infinite or not-a-number
+    ValueCount wideTotals;     ///< totals wider than the column, with the last row above them
+    quint64 wideZeros = 0;     ///< how many of the missing values show as a 0 that is wider than the column
+    WidestText widest;         ///< the widest value, where it is asked for
+    quint64 widestRow = 0;     ///< of the table, from 1; 0 for none
+    qint64 widestLine = 0;     ///< of the report, from 1
 
     /// All counts of it.
     std::array<ValueCount *, 5> counts() { return {&tooWide, &missing, &blank, &notFinite, &wideTotals}; }

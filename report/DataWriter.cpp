@@ -30,6 +30,12 @@ std::vector<FieldFormatter> formattersOf(const UXmlReportTable &table)
     return fields;
 }
 
+/// Says which line of the report the row is in that was written last.
+KA_REMARK void setRowLine(DataRemarks &remarks, qint64 line)
+{
+    remarks.setLine(line);
+}
+
 } // namespace
 
 QString chainageWordOf(const QString &heading)
@@ -126,7 +132,7 @@ void DataWriter::writeRows(const UXmlReportTable &table, UDataObjectList &list, 
         if (object != nullptr) {
             page_.writeLine(row_.view(), 0, 1, 0);
             addCells(rowCells_, page_.lastPieceStart());
-            remarks.setLine(page_.lineCount());
+            setRowLine(remarks, page_.lineCount());
             continue;
         }
         // The last line end may turn the page: without a heading it does not begin with one over no rows.
@@ -136,7 +142,7 @@ void DataWriter::writeRows(const UXmlReportTable &table, UDataObjectList &list, 
         page_.noteChange();
         page_.setHeading(noHeading);
         page_.writeLine(QStringView(), 0, 1, 0);
-        remarks.setLine(page_.lineCount());
+        setRowLine(remarks, page_.lineCount());
     }
 }
 

@@ -17,7 +17,7 @@ namespace
 constexpr qsizetype mostHeadingBlanks = 98;
 
 /// Counts a value by how it shows.
-void addShown(DataRemarks &remarks, ColumnRemarks &column, Shown shown, quint64 row)
+KA_REMARK void addShown(DataRemarks &remarks, ColumnRemarks &column, Shown shown, quint64 row)
 {
     if (shown != Shown::Whole) {
         remarks.add(shown == Shown::TooWide ? column.tooWide : column.notFinite, row);
@@ -32,6 +32,16 @@ void addMissing(DataRemarks &remarks, ColumnRemarks &column, const FieldFormatte
         remarks.add(column.missing, row);
     } else if (field.showsZeroForNone(FormatOptions())) {
         remarks.add(column.blank, row);
+    }
+}
+
+/// Counts a value that is not there, so that a block has no line for it.
+void addUnwritten(DataRemarks &remarks, ColumnRemarks &column, const FieldFormatter &field,
+                  const FormatOptions &options)
+{
+    if (field.marker() == FieldMarker::None && field.showsZeroForNone(FormatOptions())) {
+        remarks.add(column.unwritten, 0);
+        column.isBlankAsked = !field.showsZeroForNone(options);
     }
 }
 
@@ -53,7 +63,11 @@ void DataWriter::writeBlock(const UXmlReportBlock &block, const UDataObject &obj
         const sXmlReportField field = block.GetField(i);
         const FieldFormatter formatter(field);
         const UDictEntry *entry = object.Find(formatter.id());
+        ColumnRemarks *about = remarks != nullptr ? &remarks->columns[static_cast<std::size_t>(i)] : nullptr;
         if (entry == nullptr) {
+            if (about != nullptr) {
+                addUnwritten(*remarks, *about, formatter, options_);
+            }
             if (feed_.isOpen() && formatter.marker() == FieldMarker::None) {
                 feed_.skip();
             }
@@ -63,7 +77,6 @@ void DataWriter::writeBlock(const UXmlReportBlock &block, const UDataObject &obj
         row_.append(field.Label);
         row_.append(options_.separator);
         const std::size_t start = row_.size();
-        ColumnRemarks *about = remarks != nullptr ? &remarks->columns[static_cast<std::size_t>(i)] : nullptr;
         WidestText *widest = about != nullptr && remarks->measures ? &about->widest : nullptr;
         const Shown shown = formatter.append(row_, options_, entry->kind(), entry->GetData(), QStringView(), widest);
         if (feed_.isOpen() && formatter.marker() == FieldMarker::None) {

@@ -2458,6 +2458,11 @@
         <translation>%1 Werte der Variablen "%2" sind unendlich oder keine Zahlen und in keiner laufenden Summe der Tabelle "%3", der erste in Datenzeile %4</translation>
     </message>
     <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>the field "%1" of the %2 "%3" has no value: its line is left out</source>
+        <translation>das Feld "%1" (%2 "%3") hat keinen Wert: seine Zeile fehlt im Bericht</translation>
+    </message>
+    <message>
         <location filename="../jobs/JsonNode.cpp"/>
         <source>a text was expected</source>
         <translation>ein Text wurde erwartet</translation>

@@ -2458,6 +2458,11 @@
         <translation>変数「%2」の値が %1 個、無限大または数値でなく、表「%3」の累計に含まれていません (最初は %4 行目)</translation>
     </message>
     <message>
+        <location filename="../jobs/JobValueNotes.cpp"/>
+        <source>the field "%1" of the %2 "%3" has no value: its line is left out</source>
+        <translation>%2 "%3" のフィールド "%1" に値がありません: その行は出力されません</translation>
+    </message>
+    <message>
         <location filename="../jobs/JsonNode.cpp"/>
         <source>a text was expected</source>
         <translation>テキストが必要です</translation>

@@ -79,8 +79,11 @@ TEST(JobNotes, SayWhatDoesNotComeTogether)
          "a key of values"},
         {R"("values": {"Number": "1"})", R"({"block": "Point", "data": "p"})",
          "job.json:1:#: note: no column fills the field \"Northing\" of the block \"Point\"", "a block"},
-        {R"("values": {"Number": "1", "Northing": null})", R"({"block": "Point", "data": "p"})", "",
-         "a key without a value is one"},
+        {R"("values": {"Number": "1", "Northing": null})", R"({"block": "Point", "data": "p"})",
+         "job.json:1:#: note: the field \"Northing\" of the block \"Point\" has no value: its line is left out",
+         "a key without a value is one, and a number that does not show"},
+        {R"("values": {"Number": null, "Northing": 1})", R"({"block": "Point", "data": "p"})", "",
+         "a text that is missing is not a reason"},
         {R"("json": "points.json")", tableStep,
          "points.json:2:3: note: the column \"Code\" is not a variable of the dictionary \"Survey\"",
          "keys that show with the rows"},
@@ -342,6 +345,22 @@ TEST(JobNotes, NumbersThatShowAsBlanksAreInTheirFileAlone)
     EXPECT_EQ(note.firstRow, 2U);
 }
 
+TEST(JobNotes, LinesOfABlockThatAreLeftOutAsBlanksAreInTheirFileAlone)
+{
+    TestJob job;
+    job.folder.put("p.csv", "Number,Northing\n1,\n");
+    job.run(templateJob(R"("p": {"csv": "p.csv", "units": {"length": "m"}})", R"({"block": "Point", "data": "p"})",
+                        R"("strict": true, "options": {"zeroBlank": true}, )"));
+    EXPECT_FALSE(job.error) << job.text().toStdString();
+    EXPECT_EQ(notesOf(job), "") << "a number that is missing was not to show";
+    ASSERT_EQ(job.notes.all().size(), 1U);
+    const kareport::JobNote &note = job.notes.all().front();
+    EXPECT_EQ(note.kind, kareport::JobNote::Kind::BlankValue);
+    EXPECT_EQ(note.values, 1U);
+    EXPECT_EQ(note.dataPlace->line, 2);
+    EXPECT_EQ(note.dataPlace->column, 3);
+}
+
 TEST(JobNotes, AreBounded)
 {
     TestJob job;
@@ -438,6 +457,7 @@ TEST(JobNotes, AreErrorsInAStrictJob)
         const char *step = tableStep;
         const char *more = "";
     };
+    constexpr const char *pointBlock = R"({"block": "Point", "data": "p"})";
     constexpr const char *totalStep = R"({"table": "Points", "data": "p", "totals": [{"max": "Northing"}]})";
     constexpr const char *zeroBlank = R"("options": {"zeroBlank": true}, )";
     constexpr Row rows[] = {
@@ -447,6 +467,7 @@ TEST(JobNotes, AreErrorsInAStrictJob)
         {R"("csv": "wide.csv")", true, "a value that does not fit"},
         {R"("csv": "empty.csv")", true, "a number that is missing"},
         {R"("csv": "infinite.csv")", true, "a number that is not finite"},
+        {R"("csv": "empty.csv")", true, "a number that is missing, in no line of a block", pointBlock},
         {R"("csv": "empty.csv")", false, "a number that shows as blanks, as it was asked for", tableStep, zeroBlank},
         {R"("csv": "empty.csv")", true, "the same, in no total", totalStep, zeroBlank},
         {R"("csv": "good.csv")", false, "a total of all values", totalStep, zeroBlank},
