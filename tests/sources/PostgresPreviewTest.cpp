@@ -136,7 +136,7 @@ TEST_F(PostgresTables, WhatIsWrongIsSaid)
     EXPECT_EQ(wrongOf(refused).find("secret"), std::string::npos);
     EXPECT_NE(wrongOf(refused).find("~/.pgpass"), std::string::npos);
     EXPECT_EQ(wrongOf(kareport::postgresTables(server().guardedConnection(), goOn)),
-              "the server wants a password: it was expected in the user's own password file (~/.pgpass) or in "
+              "the server asks for a password: it was expected in the user's own password file (~/.pgpass) or in "
               "PGPASSWORD");
 }
 
